@@ -1,0 +1,31 @@
+# Options that every target of this project shares.
+add_library(titler_options INTERFACE)
+target_include_directories(titler_options INTERFACE ${CMAKE_SOURCE_DIR})
+target_compile_definitions(titler_options INTERFACE QT_DEPRECATED_WARNINGS)
+target_compile_options(titler_options INTERFACE -Wall -Wextra -Wpedantic -Wshadow -Wnon-virtual-dtor -Woverloaded-virtual)
+if(TITLER_WERROR)
+    target_compile_options(titler_options INTERFACE -Werror)
+endif()
+if(TITLER_SANITIZE)
+    target_compile_options(titler_options INTERFACE -fsanitize=address,undefined -fno-sanitize-recover=undefined
+                                                    -fno-omit-frame-pointer)
+    target_link_options(titler_options INTERFACE -fsanitize=address,undefined)
+endif()
+
+# titler_add_library(NAME SOURCES... ) makes the static library of one source folder.
+function(titler_add_library name)
+    add_library(${name} STATIC ${ARGN})
+    target_link_libraries(${name} PUBLIC titler_options)
+endfunction()
+
+# titler_add_test(NAME LIBS... ) builds tests/<folder>/NAME.cpp as one QtTest program and registers it.
+# Tests run without a display unless they say otherwise.
+function(titler_add_test name)
+    add_executable(${name} ${name}.cpp)
+    target_link_libraries(${name} PRIVATE titler_options Qt6::Test ${ARGN})
+    set_target_properties(${name} PROPERTIES RUNTIME_OUTPUT_DIRECTORY ${CMAKE_BINARY_DIR}/tests)
+    add_test(NAME ${name} COMMAND ${name})
+    set_tests_properties(${name} PROPERTIES
+        TIMEOUT 120
+        ENVIRONMENT "QT_QPA_PLATFORM=offscreen;LC_ALL=C.UTF-8;ASAN_OPTIONS=detect_leaks=0;K2SYS_LOG_DIR=${CMAKE_BINARY_DIR}/tests/log")
+endfunction()

@@ -1,0 +1,48 @@
+// Types of the system set-up service: languages and model of the appliance.
+#pragma once
+
+#include <QMetaType>
+
+namespace SystemSetupDef
+{
+
+// Language of the whole appliance. Values beyond these belong to the appliance and mean English here.
+enum emSystemLanguageType {
+    emSystemLanguageUnknown = 0,
+    emSystemLanguageEnglish = 1,
+    emSystemLanguageChinese = 2,
+};
+
+// Language of the soft keyboard. The names tell the script that the font tables pair with the number;
+// every other value selects the Latin-only row.
+enum emInputLanguageType {
+    emInputLanguageUnknown = 0,
+    emInputLanguageJapanese = 7,
+    emInputLanguageKorean = 8,
+    emInputLanguageChineseSimplified = 9,
+    emInputLanguageChineseMixed = 10,
+};
+
+// Model of the appliance; 1 is the model sold in China, whose only family is FAMILY_FOR_CN_MODULE.
+enum emInformationModel {
+    emInformationModelDefault = 0,
+    emInformationModelChina = 1,
+};
+
+// First field, system language, input language; three ints on the wire, in this order.
+struct tagSystemLanguageParam {
+    int first = -1;
+    int systemLanguage = 0;
+    int inputLanguage = 0;
+};
+
+// One int on the wire.
+struct tagSystemInformation {
+    int model = 0;
+};
+
+} // namespace SystemSetupDef
+
+Q_DECLARE_METATYPE(SystemSetupDef::emSystemLanguageType)
+Q_DECLARE_METATYPE(SystemSetupDef::emInputLanguageType)
+Q_DECLARE_METATYPE(SystemSetupDef::emInformationModel)
