@@ -1,0 +1,72 @@
+/*
+ * Interface of the appliance's platform library, libk2sys.so.1.
+ *
+ * The library built here takes its answers from the environment, so that the program runs on any Linux
+ * machine; on the appliance the library of the same name takes its place. All functions may be called from
+ * any thread.
+ */
+#pragma once
+
+#include <stdarg.h>
+#include <stddef.h>
+#include <time.h>
+
+#ifdef __cplusplus
+extern "C" {
+#endif
+
+#define K2SYS_API __attribute__((visibility("default")))
+#define K2SYS_EXTENSION __attribute__((visibility("default"), weak))
+
+/* Starts the library; may be called more than once. 0 on success. */
+K2SYS_API int k2sys_init(void);
+/* Counterpart of k2sys_init; ends the connection to the system log. */
+K2SYS_API void k2sys_exit(void);
+
+/* As openlog, syslog and vsyslog of the C library. The tag is copied. */
+K2SYS_API void k2sys_openlog(const char* tag, int option, int facility);
+K2SYS_API void k2sys_syslog(int priority, const char* format, ...) __attribute__((format(printf, 2, 3)));
+K2SYS_API void k2sys_vsyslog(int priority, const char* format, va_list args)
+    __attribute__((format(printf, 2, 0)));
+
+/* Writes the caller's stack to standard error. Allocates nothing, so a signal handler may call it. */
+K2SYS_API void k2sys_print_backtrace(void);
+
+/*
+ * Paths. Each writes a NUL-terminated path into a buffer of size bytes and returns a state above 0, or a
+ * negative value, with an empty string where there is room for one, when the path does not fit.
+ *
+ * root: K2SYS_AC_ROOT, else empty. 1 when it is exactly "/", else 2.
+ * data: K2SYS_AC_DATA, else $XDG_DATA_HOME/titler, else $HOME/.local/share/titler; absolute. 1.
+ * prefix: K2SYS_AC_PREFIX, else the parent of the folder that the program was started from. 1.
+ */
+K2SYS_API int k2sys_getenv_ac_root(char* buffer, size_t size);
+K2SYS_API int k2sys_getenv_ac_data(char* buffer, size_t size);
+K2SYS_API int k2sys_getenv_ac_prefix(char* buffer, size_t size);
+
+/* Current local time. 1 on success, negative otherwise. */
+K2SYS_API int k2sys_get_time(struct tm* now);
+
+/* Bytes of the file system that holds path: all of it, and what an ordinary user may still use. -1 on error.
+ * K2SYS_FS_REMAIN, when it is set to a number, is what k2sys_fs_remain reports. */
+K2SYS_API long long k2sys_fs_size(const char* path);
+K2SYS_API long long k2sys_fs_remain(const char* path);
+
+/* Zone name, such as a region, "/", a city. 1 on success, 0 when the machine has no named zone or it does not
+ * fit. */
+K2SYS_API int k2sys_get_current_timezone(char* buffer, size_t size);
+
+/*
+ * Extensions of this library. They are weak: with a library that lacks them the symbols are null, and callers
+ * go on with "/var/log" and 0.
+ *
+ * log_dir: K2SYS_LOG_DIR, else "/var/log"; returns as the paths above.
+ * port_offset: K2SYS_PORT_OFFSET, else 0. Added to a TCP port at bind and connect; values outside -1000 to
+ * 60000 read as 0.
+ */
+K2SYS_EXTENSION int k2sys_log_dir(char* buffer, size_t size);
+K2SYS_EXTENSION int k2sys_port_offset(void);
+
+#ifdef __cplusplus
+}
+#endif
