@@ -13,6 +13,8 @@
 #include "library/ITitlerFolderReporter.h"
 #include "messaging/services/FileManagerDefine.h"
 #include "messaging/services/IFileManagerController.h"
+#include "messaging/services/IFileManagerControllerCallBack.h"
+#include "messaging/services/IFileManagerControllerNotify.h"
 
 class TitlerToolFactory;
 
@@ -33,9 +35,9 @@ public:
     // Folder paths are full paths.
     void editFolderStartStatus(QString folder) override;
     void editFolderEndStatus(QString folder) override;
-    void renameFolderStartStatus(QString folder) override;
+    void renameFolderStartStatus(QString folder);
     void changeTitlerStatus(FileManagerDefine::emTITLECHANGE_TYPE type, QString path) override;
-    void changeTitlerFolderName(QString oldPath, QString newPath) override;
+    void changeTitlerFolderName(QString oldPath, QString newPath);
     void updateTitlerOrder(QString folder) override;
 
     void getClientID(int id) override;

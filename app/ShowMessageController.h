@@ -12,6 +12,8 @@
 
 #include "canvas/MessageBoxController.h"
 #include "messaging/services/IMessageCenter.h"
+#include "messaging/services/IMessageCenterCallBack.h"
+#include "messaging/services/IMessageCenterNotify.h"
 #include "messaging/services/MessageDefine.h"
 
 class ShowMessageController : public MessageBoxController,

@@ -4,6 +4,8 @@
 
 #include "canvas/IInputLanguageSource.h"
 #include "messaging/services/ISystemSetupManager.h"
+#include "messaging/services/ISystemSetupManagerCallBack.h"
+#include "messaging/services/ISystemSetupManagerNotify.h"
 #include "messaging/services/SystemSetupDef.h"
 
 class TitlerToolFactory;

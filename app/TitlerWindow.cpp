@@ -79,6 +79,9 @@ TitlerWindow::TitlerWindow(bool deferArchiveList, QWidget* parent)
     setAppDefaultParameter();
     setAttribute(Qt::WA_AcceptTouchEvents);
     ICanvasHost::setInstance(this);
+    MessageBoxController::setProvider(
+        []() -> MessageBoxController* { return ShowMessageController::getInstance(); },
+        &ShowMessageController::clearInstance);
 
     setWindowTitle(tr("Titler"));
     setGeometry(MAIN_RECT);
@@ -119,6 +122,7 @@ TitlerWindow::~TitlerWindow()
         mInputContext->setKeyBoardController(nullptr);
     if (mTranslator)
         mTranslator->deleteLater();
+    MessageBoxController::setProvider(nullptr, nullptr);
     ICanvasHost::setInstance(nullptr);
     mFactory.reset();
     UNINIT_LOGGING();
@@ -264,8 +268,7 @@ void TitlerWindow::initProcessCommunications()
     if (!mFactory)
         return;
     mInputContext = KSInputContext::instance();
-    mSoftKeyBoardController =
-        mFactory->createService<ISoftKeyBoardController>(SOFT_KEYBOARD_SERVICE_ID);
+    mSoftKeyBoardController = mFactory->createService<ISoftKeyBoardController>(SOFT_KEYBOARD_SERVICE_ID);
     if (mInputContext) {
         mInputContext->setWindowID(winId());
         if (mSoftKeyBoardController)
