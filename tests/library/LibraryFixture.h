@@ -88,7 +88,8 @@ public:
         return archive;
     }
 
-    // Writes title files of these stems, each showing its stem as text, with small pictures and an order file.
+    // Writes title files of these stems, each showing its stem as text, with small pictures and an order
+    // file.
     static void fillFolder(const QString& folder, const QStringList& stems)
     {
         ArchiveController controller;
@@ -167,7 +168,10 @@ public:
         return files.contains(QString::fromStdWString(fileName));
     }
     void insertFilePath(std::wstring fileName) override { files.append(QString::fromStdWString(fileName)); }
-    void deleteFilePath(std::wstring fileName) override { files.removeAll(QString::fromStdWString(fileName)); }
+    void deleteFilePath(std::wstring fileName) override
+    {
+        files.removeAll(QString::fromStdWString(fileName));
+    }
 
     bool createNew = false;
     QStringList files;

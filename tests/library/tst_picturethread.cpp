@@ -33,6 +33,15 @@ QList<QImage> pictures(const QColor& colour)
     return {big, big.scaled(960, 540)};
 }
 
+// Tells when the last copy of it is gone.
+QImage watchedPicture(QSemaphore& gone)
+{
+    static uchar pixels[16 * 16 * 4] = {};
+    return QImage(
+        pixels, 16, 16, QImage::Format_ARGB32_Premultiplied,
+        [](void* info) { static_cast<QSemaphore*>(info)->release(); }, &gone);
+}
+
 } // namespace
 
 class tst_PictureThread : public QObject
@@ -126,17 +135,18 @@ void tst_PictureThread::jobQueuedAtTheEndIsNeverWritten()
     auto thread = std::make_unique<PictureThread>();
     thread->addArchive(first.get(), pictures(Qt::red));
     QVERIFY(reporter.reached.tryAcquire(1, 20000));
-    thread->addArchive(second.get(), pictures(Qt::red));
+    QSemaphore dropped;
+    thread->addArchive(second.get(), {watchedPicture(dropped), pictures(Qt::red).back()});
 
-    // The destructor drops the second job before it waits for the first one.
     std::unique_ptr<QThread> ending(QThread::create([&] { thread.reset(); }));
-    const PictureThread* watched = thread.get();
-    Q_UNUSED(watched);
     ending->start();
-    QTRY_VERIFY(ending->isRunning());
-    reporter.goOn.release(2);
+    // The destructor drops the second job before it waits for the first one.
+    QVERIFY(dropped.tryAcquire(1, 20000));
+    reporter.goOn.release();
     QVERIFY(ending->wait(20000));
     QVERIFY(QFile::exists(folder + QStringLiteral("/first_1920.png")));
+    QVERIFY(!QFile::exists(folder + QStringLiteral("/second_1920.png")));
+    QCOMPARE(reporter.reached.available(), 0);
 }
 
 void tst_PictureThread::jobsAreWrittenInOrder()
@@ -158,8 +168,8 @@ void tst_PictureThread::jobsAreWrittenInOrder()
 void tst_PictureThread::unwritableFolderIsPassedOver()
 {
     TitleReportRecorder reports;
-    const auto archive = LibraryFixture::makeRecord(QStringLiteral("/nonexistent/folder"),
-                                                    QStringLiteral("t"), QString());
+    const auto archive =
+        LibraryFixture::makeRecord(QStringLiteral("/nonexistent/folder"), QStringLiteral("t"), QString());
     PictureThread thread;
     thread.addArchive(archive.get(), pictures(Qt::red));
     QTRY_VERIFY(thread.isThreadWaiting());
