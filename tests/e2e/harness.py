@@ -24,7 +24,7 @@ OFFSET = int(os.environ.get("TITLER_TEST_OFFSET", "21000"))
 SLOW = 4 if os.path.basename(BUILD).endswith("asan") else 1
 
 # Where things are in the window, in its own pixels.
-CANVAS = (629, 172, 1280, 720)
+CANVAS = (609, 97, 1280, 720)
 LIST_WIDTH = 549
 PICTURES = {"_1920.png": (1920, 1080), "_960.png": (960, 540), "_240.png": (240, 135), "_240S.png": (240, 135)}
 
