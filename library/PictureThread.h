@@ -27,7 +27,7 @@ public:
 
     // Queues one job; keeps a copy of the record. The first image is the 1920x1080 picture, the second the
     // 960x540 one. A null record or fewer images do nothing. GUI thread; never waits for a picture.
-    void addArchive(Archive* archive, QList<QImage> images);
+    void addArchive(const Archive* archive, QList<QImage> images);
 
     // True when no job is queued or being written. From the moment a job is queued this is false until its
     // files are in place. Any thread.

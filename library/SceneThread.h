@@ -21,7 +21,7 @@ public:
     ~SceneThread() override;
 
     // Queues a copy of the record; it is written to the record's own path. Null does nothing. GUI thread.
-    void addArchive(Archive* archive);
+    void addArchive(const Archive* archive);
 
 protected:
     void run() override;

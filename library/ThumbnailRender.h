@@ -39,7 +39,7 @@ public:
 
     // False: the fast stage, which ends in saveHalfThumbnailsOK. True: the slow stage, which queues the
     // files. Null does nothing. The record is only read.
-    void makeThumbnail(Archive* archive, bool bigSize) override;
+    void makeThumbnail(const Archive* archive, bool bigSize) override;
     // True when every queued picture has been written.
     bool makePictureThreadIsFinished() override;
 
@@ -49,13 +49,13 @@ public:
 
 private:
     void makeMiddleAndSmallSizeThumbnail(const Archive& archive);
-    void makeBigSizeThumbnail(Archive& archive);
+    void makeBigSizeThumbnail(const Archive& archive);
     void createMiddleSizeCanvasSceneUsingArchiveData(const Archive& archive);
     void createBigSizeCanvasSceneUsingArchiveData(const Archive& archive);
     QImage renderMiddleSizeCanvasScene();
     QList<QImage> renderBigAndMiddleSizeCanvasScene();
     void saveMiddleSizeThumnail(const Archive& archive, const QImage& image);
-    void saveBigSizeThumnail(Archive& archive, const QList<QImage>& images);
+    void saveBigSizeThumnail(const Archive& archive, const QList<QImage>& images);
     void clearMiddleSizeCanvasScene();
     void clearBigSizeCanvasScene();
 
