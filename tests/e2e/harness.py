@@ -25,7 +25,8 @@ SLOW = 4 if os.path.basename(BUILD).endswith("asan") else 1
 
 # Where things are in the window, in its own pixels.
 CANVAS = (609, 97, 1280, 720)
-LIST_WIDTH = 549
+LIST_POINT = (380, 130)
+LIST_ROW = 143
 PICTURES = {"_1920.png": (1920, 1080), "_960.png": (960, 540), "_240.png": (240, 135), "_240S.png": (240, 135)}
 
 
@@ -78,6 +79,7 @@ class TitlerTest(unittest.TestCase):
         self.display = None
         self.appliance = None
         self.titler = None
+        self.copied = False
         self.base = self.provision()
         self.display = session.Display(os.path.join(self.work, "x"), self.environment)
         self.addCleanup(self.display.stop)
@@ -159,6 +161,28 @@ class TitlerTest(unittest.TestCase):
     def click_tool(self, name):
         self.click(*TOOL_POINTS[name])
 
+    def close_window(self):
+        self.click_tool("Close")
+        self.wait_hidden()
+
+    def choose_in_list_menu(self, row, entry):
+        """Opens the option menu of the title in this row by a right click and chooses an entry by keys."""
+        x, y = LIST_POINT
+        self.click(x, y + row * LIST_ROW, button=3)
+        self.display.wait_until_still()
+        # The keys step over entries that are disabled: without a copy there is nothing to paste.
+        entries = ["Create New", "Copy", "Paste", "Delete"] if self.copied else ["Create New", "Copy", "Delete"]
+        self.display.xdotool("key", "--delay", "60", *["Down"] * (entries.index(entry) + 1), "Return")
+        self.copied = self.copied or entry == "Copy"
+        self.display.wait_until_still()
+
+    def wait_titles(self, folder, count, timeout=20):
+        session.wait_until(lambda: len(self.titles(folder)) == count, timeout * SLOW, f"{count} titles in {folder}")
+
+    def wait_keyboard(self, start, timeout=20):
+        """Waits until the titler has asked for the soft keyboard."""
+        self.appliance.wait_event("keyboard-show", timeout * SLOW, start)
+
     def type_keys(self, text):
         self.display.xdotool("type", "--clearmodifiers", "--delay", "40", text)
 
@@ -187,6 +211,16 @@ class TitlerTest(unittest.TestCase):
         for suffix, (width, height) in PICTURES.items():
             with self.subTest(picture=suffix):
                 self.assertEqual(pngdiff("size", title.picture(suffix)), {"width": width, "height": height})
+
+    def assert_no_leftovers(self, folder):
+        """Nothing but titles, their pictures and the order lies in the folder."""
+        known = {".order.xml"}
+        for title in self.titles(folder):
+            stem = os.path.basename(title.stem)
+            known.add(stem + ".xml")
+            known.update(stem + suffix for suffix in PICTURES)
+            known.update(stem + suffix for suffix in ("_source_1280.png", "_source_1920.png"))
+        self.assertEqual(set(os.listdir(folder)) - known, set())
 
     def wait_text(self, title, wanted, timeout=20):
         """Waits until the file holds a text object with this text."""
