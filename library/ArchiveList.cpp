@@ -20,9 +20,8 @@
 namespace
 {
 
-const int ITEMS_IN_VIEW = 6; // before the list scrolls to the selection
-const int LOADER_POLL = 1;   // ms
-const int MENU_FONT_SIZE = 28; // pixels
+const int ITEMS_IN_VIEW = 6;    // before the list scrolls to the selection
+const int LOADER_POLL = 1;      // ms
 const int LABEL_FONT_SIZE = 13; // points
 
 } // namespace

@@ -23,6 +23,7 @@ class ArchiveItem;
 class ArchiveMenu;
 class ArchiveOrder;
 class CanvasScene;
+class ITitlerAPPEventFilterController;
 class QAction;
 class QLabel;
 class QUndoCommand;
@@ -34,6 +35,7 @@ class ArchiveList : public ArchiveColumn
 public:
     static const int LIMIT_REMAIN = 200; // with KB_MILLION: kilobytes that must stay free on the disk
     static const int KB_MILLION = 1000;
+    static const int MENU_FONT_SIZE = 28; // pixels
 
     // The label shows the name of the folder; it is not owned and must outlive the list. With autoInit the
     // last folder, or else the first one, is opened at once.
@@ -105,8 +107,6 @@ signals:
     void signalAddArchiveData();
     void signalAddOneArchiveData(ArchiveItem* item);
     void signalStartPasteArchive();
-    // A popup of the list opened or closed; sibling processes are to know while one is open.
-    void signalPopupOpen(bool open);
 
 public slots:
     void slotHideOptionMenu();
@@ -148,6 +148,8 @@ private:
     void offerTemplateOrReportFull();
     void showOptionMenu(ArchiveItem* item, QPoint pos);
     void createOptionMenu();
+    // Sibling processes know that a popup is open, and a press in one of them closes it.
+    void sendTitlerAppEvent(bool open);
     void exeCreateArchive();
     void exeCopyArchive();
     void exePasteArchive();
@@ -166,6 +168,7 @@ private:
     TitlePictures mCopyPictures;
     QLabel* mFolderLabel;
     CanvasScene* mMainScene = nullptr;
+    QPointer<ITitlerAPPEventFilterController> mEventController;
     QString mCurrentPath;
     QFont mMenuFont;
     QPointer<ArchiveItem> mSelectedItem;

@@ -9,6 +9,7 @@
 #include "library/PasteArchiveCommand.h"
 #include "support/LogManager.h"
 #include "support/SystemInfo.h"
+#include "touchui/ITitlerAPPEventFilterController.h"
 
 #include <QLabel>
 #include <QWheelEvent>
@@ -91,8 +92,20 @@ void ArchiveList::showOptionMenu(ArchiveItem* item, QPoint pos)
     if (mapFromGlobal(anchor).y() >= upperPart)
         anchor.ry() -= mMenu->sizeHint().height();
     mMenu->popup(anchor);
-    emit signalPopupOpen(true);
+    sendTitlerAppEvent(true);
     emit archiveListMenuShow();
+}
+
+void ArchiveList::sendTitlerAppEvent(bool open)
+{
+    if (!mEventController) {
+        mEventController = ITitlerAPPEventFilterController::getInstance();
+        if (!mEventController)
+            return;
+        connect(mEventController, &ITitlerAPPEventFilterController::signalRestoreOriginal, this,
+                &ArchiveList::slotHideOptionMenu);
+    }
+    mEventController->sendAPPEvent(APPEventDefine::LOCKTYPE_OBJECT, open);
 }
 
 bool ArchiveList::IsOptionMenuShowing() const
@@ -105,12 +118,12 @@ void ArchiveList::slotHideOptionMenu()
     if (!IsOptionMenuShowing())
         return;
     mMenu->hide();
-    emit signalPopupOpen(false);
+    sendTitlerAppEvent(false);
 }
 
 void ArchiveList::slotMenuAboutToClose()
 {
-    emit signalPopupOpen(false);
+    sendTitlerAppEvent(false);
     clearOperationItemState(mOperationItem);
 }
 
@@ -238,7 +251,7 @@ void ArchiveList::exeDeleteArchive()
 void ArchiveList::setSystemLanFont(QString family)
 {
     mMenuFont = QFont(family);
-    mMenuFont.setPixelSize(28);
+    mMenuFont.setPixelSize(MENU_FONT_SIZE);
     ArchiveItem::setSystemFontFamily(family);
     for (int i = 0; i < count(); ++i)
         getWidgetItem(i)->updateRightChild();

@@ -54,6 +54,7 @@ private:
     void createBigSizeCanvasSceneUsingArchiveData(const Archive& archive);
     QImage renderMiddleSizeCanvasScene();
     QList<QImage> renderBigAndMiddleSizeCanvasScene();
+    static void deleteOldFile(const Archive& archive);
     void saveMiddleSizeThumnail(const Archive& archive, const QImage& image);
     void saveBigSizeThumnail(const Archive& archive, const QList<QImage>& images);
     void clearMiddleSizeCanvasScene();

@@ -1,5 +1,5 @@
-// Where the list's undo commands report titles that come and go: the file manager by full path, and the request
-// at hand by plain file name. Whatever is not installed is left out. GUI thread.
+// Where the list's undo commands report titles that come and go: the file manager by full path, and the
+// request at hand by plain file name. Whatever is not installed is left out. GUI thread.
 #pragma once
 
 #include "messaging/services/FileManagerDefine.h"

@@ -43,7 +43,6 @@ private:
     void init();
     void touchCancelEvent();
     void moveIntoWidget(QPoint& position, QPoint& screenPosition) const;
-    void sendPress();
     void sendRelease(const QPoint& position, const QPoint& screenPosition);
 
     int m_touchId = -1;

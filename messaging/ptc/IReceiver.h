@@ -14,7 +14,8 @@ class IReceiver : public IObject
 public:
     // Takes the event and its data over; the data was allocated with array new.
     virtual void recv(Event* event) = 0;
-    // Both take the adapter over. An adapter whose id is taken is not entered, and deleted.
+    // Both take the adapter over. An adapter whose id is taken never gets an event, and lives as long as the
+    // receiver.
     virtual void addAdapter(IAdapterBase* adapter) = 0;
     virtual void addCBAdapter(IAdapterBase* adapter) = 0;
     // Deletes the callback adapter with that id.

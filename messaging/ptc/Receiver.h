@@ -5,6 +5,7 @@
 
 #include <map>
 #include <memory>
+#include <vector>
 
 namespace PTC
 {
@@ -32,8 +33,11 @@ public:
 private:
     using AdapterMap = std::map<long, std::unique_ptr<IAdapterBase>>;
 
+    void enter(AdapterMap& adapters, IAdapterBase* adapter);
+
     AdapterMap m_adapters;
     AdapterMap m_callbackAdapters;
+    std::vector<std::unique_ptr<IAdapterBase>> m_lostAdapters; // their ids were taken
     long m_id;
 };
 

@@ -22,7 +22,7 @@ constexpr long IS_CALLBACK = 32;
 constexpr long SIZE = 40;
 constexpr long IS_REMOTE = 48;
 
-// The TCP port of a client number in this environment.
+// The TCP port of a client number in this environment; 0 when there is none.
 unsigned short portOf(long identity);
 
 } // namespace SocketFrame

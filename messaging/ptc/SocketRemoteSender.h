@@ -2,8 +2,14 @@
 #pragma once
 
 #include "messaging/ptc/RemoteSender.h"
+#include "messaging/ptc/SocketFrame.h"
 
 #include <array>
+
+namespace PTC
+{
+class Event;
+}
 
 class SocketRemoteSender : public PTC::RemoteSender
 {
@@ -34,6 +40,6 @@ private:
     void closeSocket();
 
     int m_socket = -1;
-    std::array<char, 20480> m_frame;
+    std::array<char, SocketFrame::FRAME_SIZE> m_frame{};
     long m_usedBytes = 0; // of m_frame; the rest is zero
 };
