@@ -53,7 +53,7 @@ QString extensionOf(const std::string& fileName)
 {
     const QString name = QString::fromStdString(fileName);
     const qsizetype dot = name.lastIndexOf(QLatin1Char('.'));
-    return dot < 0 ? QString() : name.mid(dot);
+    return dot < 0 || dot < name.lastIndexOf(QLatin1Char('/')) ? QString() : name.mid(dot);
 }
 
 } // namespace
