@@ -115,7 +115,7 @@ QImage SampleBackgrounds::stageLights()
     QRadialGradient floor(960, HEIGHT, 1100);
     floor.setColorAt(0, QColor(120, 90, 160, 150));
     floor.setColorAt(1, QColor(10, 8, 20, 0));
-    painter.fillRect(0, 760, WIDTH, HEIGHT - 760, floor);
+    painter.fillRect(image.rect(), floor);
     return image;
 }
 

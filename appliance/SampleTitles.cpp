@@ -100,20 +100,20 @@ std::vector<SampleTitles::Sample> welcome()
           {.x = 700, .y = 520, .family = CHINESE, .size = 96, .color = "#FFD24D", .shadow = RIGHT_DOWN}}}));
     samples.push_back(sample(
         "20240101090000002", SampleBackgrounds::stageLights,
-        {{"Live", {.x = 60, .y = 20, .family = LATIN, .size = 88, .color = "#FFFFFF", .shadow = RIGHT_DOWN}},
-         {"现场直播", {.x = 660, .y = 140, .family = CHINESE, .size = 100, .color = "#FFD24D"}},
+        {{"Live", {.x = 60, .y = 20, .family = LATIN, .size = 87, .color = "#FFFFFF", .shadow = RIGHT_DOWN}},
+         {"现场直播", {.x = 660, .y = 140, .family = CHINESE, .size = 99, .color = "#FFD24D"}},
          {"生放送",
-          {.x = 60, .y = 300, .family = JAPANESE, .size = 110, .edgeWidth = 4, .edgeColor = "#7A1050"}},
+          {.x = 60, .y = 300, .family = JAPANESE, .size = 111, .edgeWidth = 4, .edgeColor = "#7A1050"}},
          {"생방송",
-          {.x = 700, .y = 440, .family = KOREAN, .size = 110, .color = "#8FE3FF", .shadow = CENTRE_DOWN}}}));
+          {.x = 700, .y = 440, .family = KOREAN, .size = 111, .color = "#8FE3FF", .shadow = CENTRE_DOWN}}}));
     samples.push_back(
         sample("20240101090000003", SampleBackgrounds::lowerThird,
-               {{"Café Zürich", {.x = 20, .y = 530, .family = "Nimbus Roman No9 L", .size = 80}},
-                {"10:30", {.x = 960, .y = 530, .family = "Nimbus Mono L", .size = 80, .color = "#FFD24D"}}}));
+               {{"Café Zürich", {.x = 20, .y = 530, .family = "Nimbus Roman No9 L", .size = 81}},
+                {"10:30", {.x = 960, .y = 530, .family = "Nimbus Mono L", .size = 81, .color = "#FFD24D"}}}));
     samples.push_back(
         sample("20240101090000004", nullptr,
                {{"Good night",
-                 {.x = 300, .y = 260, .family = LATIN, .size = 110, .edgeWidth = 4, .shadow = RIGHT_DOWN}}}));
+                 {.x = 300, .y = 260, .family = LATIN, .size = 111, .edgeWidth = 4, .shadow = RIGHT_DOWN}}}));
     return samples;
 }
 

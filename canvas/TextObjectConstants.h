@@ -35,6 +35,8 @@ struct TextObjectConstants {
     static constexpr double STANDARD_BLUR_RADIUS = 16.0;
     static constexpr double MINIMUM_BLUR_RADIUS = 1.0;
     static constexpr int DEFAULT_MINIMUM_SIZE = 20;
+    // The largest size that the panel offers.
+    static constexpr int MAXIMUM_FONT_SIZE = 999;
     // Text objects are drawn with this colour, whatever their record says.
     inline static const QColor DROP_SHADOW_COLOR{0, 0, 0, 190};
 

@@ -120,7 +120,7 @@ bool SocketRemoteReceiver::prepareListeningSocket()
     address.sin_addr.s_addr = htonl(INADDR_LOOPBACK);
     address.sin_port = htons(SocketFrame::portOf(getIdentity()));
     if (address.sin_port == 0 ||
-        bind(m_listenSocket, reinterpret_cast<sockaddr*>(&address), sizeof address) != 0) {
+        ::bind(m_listenSocket, reinterpret_cast<sockaddr*>(&address), sizeof address) != 0) {
         return failStart("[Error]Socket Server create failed!");
     }
     if (listen(m_listenSocket, LISTEN_BACKLOG) != 0) {
