@@ -1,6 +1,7 @@
 // Loads the titles of a folder off the GUI thread.
 #pragma once
 
+#include "document/Archive.h"
 #include "document/ArchiveController.h"
 
 #include <QList>
@@ -8,8 +9,6 @@
 #include <QString>
 #include <QThread>
 #include <atomic>
-
-class Archive;
 
 class ArchiveInitThread : public QThread
 {

@@ -6,6 +6,7 @@
 // that the menu acts on. GUI thread only.
 #pragma once
 
+#include "document/Archive.h"
 #include "library/ArchiveColumn.h"
 #include "library/TitleFileOperations.h"
 
@@ -16,7 +17,6 @@
 #include <QString>
 #include <memory>
 
-class Archive;
 class ArchiveController;
 class ArchiveInitThread;
 class ArchiveItem;
@@ -130,8 +130,6 @@ public slots:
     void moveCurrentArchiveItemVisble();
     // Not owned.
     void setMainScene(CanvasScene* mainScene);
-
-protected:
     void wheelEvent(QWheelEvent* event) override;
 
 private:

@@ -397,7 +397,8 @@ void tst_ArchiveList::wheelHidesTheMenu()
     const auto wheel = [this](int delta) {
         QWheelEvent event(QPointF(100, 100), mList->mapToGlobal(QPointF(100, 100)), QPoint(),
                           QPoint(0, delta), Qt::NoButton, Qt::NoModifier, Qt::NoScrollPhase, false);
-        QCoreApplication::sendEvent(mList->viewport(), &event);
+        // An open popup keeps wheel events that are sent through the application to itself.
+        mList->wheelEvent(&event);
     };
     wheel(-120);
     QVERIFY(!mList->IsOptionMenuShowing());
