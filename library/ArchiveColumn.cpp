@@ -30,6 +30,12 @@ ArchiveColumn::ArchiveColumn(QWidget* parent)
     mBoard->setObjectName(QStringLiteral("layoutBoard"));
     mBoard->setStyleSheet(QStringLiteral("QWidget#layoutBoard { background-color: rgb(51, 51, 51) }"));
     setWidget(mBoard);
+    mBar->setStyleSheet(QStringLiteral(
+        "QScrollBar:vertical { margin: 0px; border: 0px; width: 32px; background-color: rgb(51, 51, 51) }"
+        "QScrollBar::up-arrow:vertical { height: 0px } QScrollBar::down-arrow:vertical { height: 0px }"
+        "QScrollBar::add-line:vertical { height: 0px } QScrollBar::sub-line:vertical { height: 0px }"
+        "QScrollBar::add-page:vertical, QScrollBar::sub-page:vertical { background: none }"
+        "QScrollBar::handle:vertical { min-height: 42px; background-color: rgb(102, 102, 102) }"));
 
     QScrollBar* own = verticalScrollBar();
     connect(own, &QScrollBar::rangeChanged, mBar, &QScrollBar::setRange);

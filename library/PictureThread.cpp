@@ -3,6 +3,7 @@
 #include "document/Archive.h"
 #include "document/ITitleChangeReporter.h"
 #include "document/ImageResizer.h"
+#include "document/PngWriter.h"
 #include "library/TitlerUtility.h"
 
 #include <QMutexLocker>
@@ -10,6 +11,20 @@
 
 const QSize PictureThread::THUMBNAIL_SMALL_SIZE(240, 135);
 const QSize PictureThread::THUMBNAIL_MIDDLE_SIZE(960, 540);
+
+namespace
+{
+
+// Empty for a name that is none or that leads out of the title's folder: a title file from elsewhere must not
+// choose which files of the appliance are overwritten.
+QString picturePath(const Archive& archive, const std::string& name)
+{
+    if (name.empty() || name.find('/') != std::string::npos)
+        return {};
+    return QString::fromStdString(TitlerUtility::getThumbnailPathFromTitlePath(archive.getPath(), name));
+}
+
+} // namespace
 
 PictureThread::PictureThread(QObject* parent) : QThread(parent)
 {
@@ -61,4 +76,22 @@ void PictureThread::run()
         job = Job(); // the images go before the job counts as finished
         --mUnfinished;
     }
+}
+
+void PictureThread::saveArchiveThumnail(const Archive& archive, const QImage& big, const QImage& middle)
+{
+    const QString bigPath = picturePath(archive, archive.getThumbnailBig());
+    const QString middlePath = picturePath(archive, archive.getThumbnailMiddle());
+    const QString blackPath = picturePath(archive, archive.getThumbnailBlack());
+    const QString smallPath = picturePath(archive, archive.getThumbnailSmall());
+
+    // A picture that cannot be written is passed over: the others still help.
+    PngWriter::save(middle, middlePath);
+    PngWriter::save(big, bigPath);
+    ImageResizer().resizeImageToThumbnail(middle, blackPath.toStdWString(), smallPath.toStdWString(),
+                                          static_cast<unsigned>(THUMBNAIL_SMALL_SIZE.width()),
+                                          static_cast<unsigned>(THUMBNAIL_SMALL_SIZE.height()));
+    if (ITitleChangeReporter* reporter = ITitleChangeReporter::instance())
+        reporter->changeTitlerStatus(FileManagerDefine::TITLE_PICTURES_CHANGED,
+                                     QString::fromStdString(archive.getPath()));
 }

@@ -2,8 +2,8 @@
 
 #include "document/Archive.h"
 #include "document/ArchiveController.h"
-#include "document/AtomicFile.h"
 #include "library/TitlerUtility.h"
+#include "support/AtomicFile.h"
 #include "support/LogManager.h"
 
 #include <QDir>
@@ -24,14 +24,14 @@ namespace
 {
 
 // No picture of a title comes near this; what is larger is not one of ours.
-constexpr qint64 PICTURE_LIMIT = 64LL * 1024 * 1024;
+constexpr std::size_t PICTURE_LIMIT = 64 * 1024 * 1024;
 
 QByteArray readPicture(const QString& path)
 {
-    QFile file(path);
-    if (path.isEmpty() || !file.open(QIODevice::ReadOnly) || file.size() > PICTURE_LIMIT)
+    std::string bytes;
+    if (path.isEmpty() || !AtomicFile::read(path.toStdString(), PICTURE_LIMIT, bytes))
         return {};
-    return file.readAll();
+    return QByteArray::fromStdString(bytes);
 }
 
 QString pictureOf(const Archive& archive, const std::string& name)
@@ -44,7 +44,8 @@ QString pictureOf(const Archive& archive, const std::string& name)
 void writePicture(const Archive& archive, const std::string& name, const QByteArray& bytes)
 {
     if (!name.empty() && !bytes.isEmpty())
-        AtomicFile::write(pictureOf(archive, name), bytes, AtomicFile::NoSync);
+        AtomicFile::write(pictureOf(archive, name).toStdString(),
+                          {bytes.constData(), static_cast<std::size_t>(bytes.size())});
 }
 
 // From the last "." on; empty when there is none.
@@ -52,7 +53,7 @@ QString extensionOf(const std::string& fileName)
 {
     const QString name = QString::fromStdString(fileName);
     const qsizetype dot = name.lastIndexOf(QLatin1Char('.'));
-    return dot < 0 ? QString() : name.mid(dot);
+    return dot < 0 || dot < name.lastIndexOf(QLatin1Char('/')) ? QString() : name.mid(dot);
 }
 
 } // namespace
