@@ -18,8 +18,7 @@ QTextLine lineOf(const QTextBlock& block, int column)
 }
 } // namespace
 
-CaretGeometry::CaretGeometry(const QTextDocument& document)
-    : m_document(document)
+CaretGeometry::CaretGeometry(const QTextDocument& document) : m_document(document)
 {
 }
 

@@ -8,8 +8,8 @@
 
 class QTextBlock;
 
-// Where the positions of a laid-out document stand, in item coordinates. Line heights are added up once per layout, so
-// that asking for every position of a document stays linear in its blocks. GUI thread only.
+// Where the positions of a laid-out document stand, in item coordinates. Line heights are added up once per
+// layout, so that asking for every position of a document stays linear in its blocks. GUI thread only.
 class CaretGeometry
 {
 public:
@@ -18,8 +18,8 @@ public:
     // Call when the layout changed.
     void invalidate() { m_valid = false; }
 
-    // The caret of a position: line from its top to its bottom, point at the top left of the handle below it, number of
-    // the block. False for a position outside the document; the arguments stay then.
+    // The caret of a position: line from its top to its bottom, point at the top left of the handle below it,
+    // number of the block. False for a position outside the document; the arguments stay then.
     bool caretPoint(QLineF& line, QPointF& point, int& block, int position);
 
     // Places of the carets of all positions of one block.

@@ -59,7 +59,10 @@ FontStore& store()
     return fontStore;
 }
 
-int kerning(const TextStyle& style) { return std::clamp(style.getTextKerning(), 0, MaximumKerning); }
+int kerning(const TextStyle& style)
+{
+    return std::clamp(style.getTextKerning(), 0, MaximumKerning);
+}
 
 } // namespace
 

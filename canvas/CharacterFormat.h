@@ -8,8 +8,9 @@
 
 class TextStyle;
 
-// Turns character styles into fonts and layout formats. Fonts are shared by all text objects and kept by family, size,
-// weight, slant and spacing, so that a character costs no look-up in the font system. GUI thread only.
+// Turns character styles into fonts and layout formats. Fonts are shared by all text objects and kept by
+// family, size, weight, slant and spacing, so that a character costs no look-up in the font system. GUI
+// thread only.
 class CharacterFormat
 {
 public:

@@ -65,12 +65,14 @@ bool drawnAsPicture(const QFont& font, const QString& text)
                        [](const QGlyphRun& run) { return isPictureFont(run.rawFont()); });
 }
 
-int bytesOf(const QPainterPath& path) { return path.elementCount() * int(sizeof(QPainterPath::Element)); }
+int bytesOf(const QPainterPath& path)
+{
+    return path.elementCount() * int(sizeof(QPainterPath::Element));
+}
 
 } // namespace
 
-GlyphPath::GlyphPath(const QFont& font, const QString& text)
-    : m_hasPath(!drawnAsPicture(font, text))
+GlyphPath::GlyphPath(const QFont& font, const QString& text) : m_hasPath(!drawnAsPicture(font, text))
 {
     if (!m_hasPath)
         return;

@@ -48,6 +48,8 @@ public:
     // The other half of the pair, or null.
     GraphicsText* parentTextItem() const;
     GraphicsText* childTextItem() const;
+    // The item whose position places the object: the parent of a pair, else this one.
+    QGraphicsItem* placedItem();
 
     // The live record, owned by the item.
     TText* getItemTText() const;

@@ -11,7 +11,10 @@ namespace
 // Positions beyond these are no places on a canvas; a scene index cannot hold them.
 constexpr float PlaceLimit = 100000.0F;
 
-float usablePlace(float value) { return std::isfinite(value) ? std::clamp(value, -PlaceLimit, PlaceLimit) : 0.0F; }
+float usablePlace(float value)
+{
+    return std::isfinite(value) ? std::clamp(value, -PlaceLimit, PlaceLimit) : 0.0F;
+}
 
 bool sameStyle(const TextStyle& a, const TextStyle& b)
 {
@@ -43,10 +46,14 @@ void copyObjectProperties(TText& out, const TText& from)
 
 bool isCombining(QChar c)
 {
-    return c.isMark() || c.isLowSurrogate() || c == QChar(0x200D) || (c.unicode() >= 0xFE00 && c.unicode() <= 0xFE0F);
+    return c.isMark() || c.isLowSurrogate() || c == QChar(0x200D) ||
+           (c.unicode() >= 0xFE00 && c.unicode() <= 0xFE0F);
 }
 
-int sign(int value) { return value > 0 ? 1 : (value < 0 ? -1 : 0); }
+int sign(int value)
+{
+    return value > 0 ? 1 : (value < 0 ? -1 : 0);
+}
 
 } // namespace
 
@@ -64,7 +71,10 @@ bool StyleDocument::isLineBreak(int position) const
     return style && style->getText().size() == 1 && style->getText()[0] == CHARENTER;
 }
 
-QString StyleDocument::textOf(const TextStyle& style) { return QString::fromStdString(style.getText()); }
+QString StyleDocument::textOf(const TextStyle& style)
+{
+    return QString::fromStdString(style.getText());
+}
 
 QChar StyleDocument::characterAt(int position) const
 {
@@ -308,9 +318,10 @@ int StyleDocument::getMinmumSize(const TText& record)
     if (record.textItems().empty())
         return DEFAULT_MINIMUM_SIZE;
     const auto& items = record.textItems();
-    const auto smallest = std::min_element(items.begin(), items.end(), [](const TextStyle* a, const TextStyle* b) {
-        return a->getFontSize() < b->getFontSize();
-    });
+    const auto smallest =
+        std::min_element(items.begin(), items.end(), [](const TextStyle* a, const TextStyle* b) {
+            return a->getFontSize() < b->getFontSize();
+        });
     return (*smallest)->getFontSize();
 }
 

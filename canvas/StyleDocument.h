@@ -8,12 +8,12 @@
 #include <memory>
 #include <vector>
 
-// The records of one text object and the edits on them: one style for each position of the document. Plain data: it
-// neither lays out nor paints. Positions count UTF-16 units, line breaks included; a position out of range changes
-// nothing.
+// The records of one text object and the edits on them: one style for each position of the document. Plain
+// data: it neither lays out nor paints. Positions count UTF-16 units, line breaks included; a position out of
+// range changes nothing.
 //
-// A character of two units keeps its whole text in the first style and an empty string in the second, since half of it
-// has no UTF-8 form; so it survives styling, saving and loading.
+// A character of two units keeps its whole text in the first style and an empty string in the second, since
+// half of it has no UTF-8 form; so it survives styling, saving and loading.
 class StyleDocument : public TextObjectConstants
 {
 public:
@@ -43,8 +43,8 @@ public:
     // The style of the only character becomes last alpha before it goes; true in that case.
     bool remove(int position);
 
-    // Style of a character about to be inserted, from its neighbours. startOfLine: the characters behind it on its
-    // line lend their style, else those before it.
+    // Style of a character about to be inserted, from its neighbours. startOfLine: the characters behind it
+    // on its line lend their style, else those before it.
     void copyNeighbourStyle(int position, bool startOfLine, QChar added, TextStyle& out) const;
     // Takes shadow and align of the source over and copies its first style.
     void copyTTextToTextStyle(TextStyle& out, const TText& source);
@@ -70,7 +70,8 @@ public:
     int savedCursorPosition() const { return m_savedCursorPosition; }
     void setSavedCursorPosition(int position) { m_savedCursorPosition = position; }
 
-    // Scales the shadow with the smallest size: overwrites direction and blur of the record, whose signs stay.
+    // Scales the shadow with the smallest size: overwrites direction and blur of the record, whose signs
+    // stay.
     static void setItemShadowInfo(TText& record);
     static int getMinmumSize(const TText& record);
     static int getRadioValueofStandardSize(int size);

@@ -22,9 +22,7 @@ const QColor SelectedFill(0, 128, 255, 77);
 const QColor EditFill(0, 0, 0, 77);
 } // namespace
 
-TextPainter::TextPainter(GraphicsText& item)
-    : m_item(item)
-    , m_carets(*item.document())
+TextPainter::TextPainter(GraphicsText& item) : m_item(item), m_carets(*item.document())
 {
 }
 
@@ -68,7 +66,8 @@ void TextPainter::collectBlock(const QTextBlock& block)
         if (end <= begin)
             end = text.size();
         if (text.at(begin) != QChar::LineSeparator)
-            addGlyph(block.position() + int(begin), text.mid(begin, end - begin), m_blockCarets[size_t(begin)]);
+            addGlyph(block.position() + int(begin), text.mid(begin, end - begin),
+                     m_blockCarets[size_t(begin)]);
         begin = end;
     }
 }

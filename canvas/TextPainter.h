@@ -16,9 +16,10 @@ class QPainter;
 class QTextBlock;
 class QTransform;
 
-// Paints one text object: outlines below glyphs, frames, selections. Keeps what it draws until the text, a style or the
-// layout changes. A character and the marks on it are drawn as one with the style of the character, since a mark finds
-// its base only in one font; each position keeps its own style in the record. GUI thread only.
+// Paints one text object: outlines below glyphs, frames, selections. Keeps what it draws until the text, a
+// style or the layout changes. A character and the marks on it are drawn as one with the style of the
+// character, since a mark finds its base only in one font; each position keeps its own style in the record.
+// GUI thread only.
 class TextPainter : public TextObjectConstants
 {
 public:

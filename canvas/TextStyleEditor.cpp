@@ -25,7 +25,10 @@ bool sameLayout(const TextStyle& a, const TextStyle& b)
            (a.isTextEdge() != 0) == (b.isTextEdge() != 0);
 }
 
-int documentLength(const QTextDocument& document) { return document.characterCount() - 1; }
+int documentLength(const QTextDocument& document)
+{
+    return document.characterCount() - 1;
+}
 
 } // namespace
 
@@ -33,11 +36,7 @@ int documentLength(const QTextDocument& document) { return document.characterCou
 class TextStyleEditor::Guard
 {
 public:
-    explicit Guard(TextStyleEditor& editor)
-        : m_editor(editor)
-    {
-        ++m_editor.m_guard;
-    }
+    explicit Guard(TextStyleEditor& editor) : m_editor(editor) { ++m_editor.m_guard; }
     ~Guard() { --m_editor.m_guard; }
     Guard(const Guard&) = delete;
     Guard& operator=(const Guard&) = delete;
@@ -46,9 +45,7 @@ private:
     TextStyleEditor& m_editor;
 };
 
-TextStyleEditor::TextStyleEditor(GraphicsText& item)
-    : m_item(item)
-    , m_styles(item.styles())
+TextStyleEditor::TextStyleEditor(GraphicsText& item) : m_item(item), m_styles(item.styles())
 {
     m_undoTimer.setSingleShot(true);
     m_undoTimer.setInterval(EDIT_AUTO_SAVE_TIME);
@@ -156,7 +153,8 @@ int TextStyleEditor::cutOffCharsBeyondMaxNum(int position, int added)
     const int before = documentLength(document);
     QTextCursor cursor = m_item.textCursor();
     // Only what has just come may go.
-    while (documentLength(document) - (document.blockCount() - 1) > CHARACTER_LIMIT && cursor.position() > position)
+    while (documentLength(document) - (document.blockCount() - 1) > CHARACTER_LIMIT &&
+           cursor.position() > position)
         cursor.deletePreviousChar();
     updateWidthAndAlign(m_lastWidth);
     return std::max(added - (before - documentLength(document)), 0);
@@ -199,7 +197,8 @@ void TextStyleEditor::styleNewCharacter(int position, bool startOfLine, QChar ch
     } else if (m_styles.isEmpty()) {
         m_styles.copyTTextToTextStyle(style, m_styles.lastAlpha());
         if (m_ensurePending && m_ensureMode == 1) {
-            style.setFontFamily(InputLanguageFonts::getDefaultFontAccordingToLanguage(character, true).toStdString());
+            style.setFontFamily(
+                InputLanguageFonts::getDefaultFontAccordingToLanguage(character, true).toStdString());
             m_ensurePending = false;
         }
     }
@@ -288,7 +287,8 @@ void TextStyleEditor::pushLastEditTextIntoStack()
 
 void TextStyleEditor::emitEdited(TText& before, TText& beforeLast)
 {
-    Q_EMIT m_item.signalObjectContentsEdited(&before, &m_styles.current(), &beforeLast, &m_styles.lastAlpha());
+    Q_EMIT m_item.signalObjectContentsEdited(&before, &m_styles.current(), &beforeLast,
+                                             &m_styles.lastAlpha());
 }
 
 // Style changes
@@ -549,7 +549,8 @@ bool TextStyleEditor::adjustLeftAndRightMargin()
 void TextStyleEditor::setDocumentAlign(double oldWidth, double width)
 {
     const int align = m_styles.current().getTextAlign();
-    const Qt::Alignment wanted = align == 0 ? Qt::AlignHCenter : (align == 1 ? Qt::AlignRight : Qt::AlignLeft);
+    const Qt::Alignment wanted =
+        align == 0 ? Qt::AlignHCenter : (align == 1 ? Qt::AlignRight : Qt::AlignLeft);
     QTextOption option = m_item.document()->defaultTextOption();
     if (option.alignment() != wanted) {
         option.setAlignment(wanted);

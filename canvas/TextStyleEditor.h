@@ -9,8 +9,8 @@
 class GraphicsText;
 class StyleDocument;
 
-// Keeps the Qt document of a text object and its style record in step: typing goes from the document into the record,
-// style changes and loading from the record into the document. Also forms the undo steps of typing.
+// Keeps the Qt document of a text object and its style record in step: typing goes from the document into the
+// record, style changes and loading from the record into the document. Also forms the undo steps of typing.
 // Lengths are item coordinates. GUI thread only.
 class TextStyleEditor : public TextObjectConstants
 {

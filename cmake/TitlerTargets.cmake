@@ -36,7 +36,8 @@ set(TITLER_TEST_ENVIRONMENT
     XDG_RUNTIME_DIR=${TITLER_TEST_DIR}/xdg/runtime
     FONTCONFIG_FILE=${TITLER_FONTS_CONF}
     K2SYS_LOG_DIR=${TITLER_TEST_DIR}/log
-    ASAN_OPTIONS=detect_leaks=0
+    ASAN_OPTIONS=detect_leaks=1
+    LSAN_OPTIONS=suppressions=${CMAKE_SOURCE_DIR}/cmake/lsan.supp:print_suppressions=0
     UBSAN_OPTIONS=print_stacktrace=1)
 
 # titler_add_test(NAME LIBS... ) builds tests/<folder>/NAME.cpp as one QtTest program and registers it.

@@ -38,6 +38,12 @@ void QtReceiver::stopReceiving()
     m_roomForMore.notify_all();
 }
 
+int QtReceiver::pendingEvents()
+{
+    const std::lock_guard<std::mutex> lock(m_mutex);
+    return m_pendingEvents;
+}
+
 void QtReceiver::customEvent(QEvent* event)
 {
     if (event->type() != static_cast<QEvent::Type>(QtReceiverEvent::TYPE)) {

@@ -26,6 +26,8 @@ public:
     // up here; the receiver's own thread is not.
     void recv(Event* event) override;
     void stopReceiving() override;
+    // Events that wait for the receiving thread. Any thread.
+    int pendingEvents();
 
 protected:
     void customEvent(QEvent* event) override;

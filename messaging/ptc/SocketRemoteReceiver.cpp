@@ -19,7 +19,7 @@ namespace
 {
 
 const int LISTEN_BACKLOG = 10;
-const boost::chrono::milliseconds ACCEPT_PAUSE(500);
+const boost::posix_time::milliseconds ACCEPT_PAUSE(500);
 
 void printLine(const char* text)
 {
@@ -166,12 +166,12 @@ void SocketRemoteReceiver::waitClientLink()
             if (errno != ECONNABORTED && errno != EINTR) {
                 // Out of descriptors or memory: the pending connection stays, and trying at once would only
                 // spin.
-                boost::this_thread::sleep_for(ACCEPT_PAUSE);
+                boost::this_thread::sleep(ACCEPT_PAUSE);
             }
             continue;
         }
         addClientThread(client);
-        boost::this_thread::sleep_for(ACCEPT_PAUSE);
+        boost::this_thread::sleep(ACCEPT_PAUSE);
     }
 }
 

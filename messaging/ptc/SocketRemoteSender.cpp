@@ -148,7 +148,7 @@ bool SocketRemoteSender::sendFrame()
 bool SocketRemoteSender::waitForRoom()
 {
     using Clock = std::chrono::steady_clock;
-    const auto deadline = Clock::now() + std::chrono::milliseconds(SEND_TIMEOUT_MS);
+    const auto deadline = Clock::now() + std::chrono::milliseconds(m_sendTimeoutMs);
     while (true) {
         const auto left =
             std::chrono::duration_cast<std::chrono::milliseconds>(deadline - Clock::now()).count();

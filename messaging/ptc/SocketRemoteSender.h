@@ -31,6 +31,7 @@ public:
     bool isConnected() const;
 
     static constexpr int SEND_TIMEOUT_MS = 10000;
+    void setSendTimeout(int milliseconds) { m_sendTimeoutMs = milliseconds; }
 
 private:
     void fillFrame(const PTC::Event& event);
@@ -40,6 +41,7 @@ private:
     void closeSocket();
 
     int m_socket = -1;
+    int m_sendTimeoutMs = SEND_TIMEOUT_MS;
     std::array<char, SocketFrame::FRAME_SIZE> m_frame{};
     long m_usedBytes = 0; // of m_frame; the rest is zero
 };
