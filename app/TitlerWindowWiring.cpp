@@ -10,6 +10,7 @@
 #include "app/TitlerPowerController.h"
 #include "app/ToolsBar.h"
 #include "canvas/CanvasScene.h"
+#include "library/ArchiveItem.h"
 #include "library/ArchiveList.h"
 #include "touchui/KSPushbutton.h"
 
