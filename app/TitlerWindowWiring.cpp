@@ -10,6 +10,7 @@
 #include "app/TitlerPowerController.h"
 #include "app/ToolsBar.h"
 #include "canvas/CanvasScene.h"
+#include "library/ArchiveItem.h"
 #include "library/ArchiveList.h"
 #include "touchui/KSPushbutton.h"
 
@@ -66,6 +67,8 @@ void TitlerWindow::connectForTextToolsAndArchiveList()
     connect(mArchiveList, &ArchiveList::cleanUndoStack, this, &TitlerWindow::clearUndoStack);
     connect(mArchiveList, &ArchiveList::archiveListMenuShow, this,
             &TitlerWindow::hideSoftWareWithDeleteEmptyItems);
+    connect(mArchiveList, &ArchiveList::widgetItemReleased, this,
+            &TitlerWindow::hideSoftWareWithOutDeleteEmptyItems);
     connect(mMoveButton, &QPushButton::clicked, this, &TitlerWindow::hideSoftWareWithDeleteEmptyItems);
 }
 

@@ -95,9 +95,9 @@ std::vector<SampleTitles::Sample> welcome()
     std::vector<SampleTitles::Sample> samples;
     samples.push_back(sample(
         "20240101090000001", SampleBackgrounds::cityNight,
-        {{"Evening News", {.x = 20, .y = 520, .family = LATIN, .size = 96, .bold = 1, .edgeWidth = 3}},
+        {{"Evening News", {.x = 20, .y = 546, .family = LATIN, .size = 96, .bold = 1, .edgeWidth = 3}},
          {"晚间新闻",
-          {.x = 700, .y = 520, .family = CHINESE, .size = 96, .color = "#FFD24D", .shadow = RIGHT_DOWN}}}));
+          {.x = 700, .y = 532, .family = CHINESE, .size = 96, .color = "#FFD24D", .shadow = RIGHT_DOWN}}}));
     samples.push_back(sample(
         "20240101090000002", SampleBackgrounds::stageLights,
         {{"Live", {.x = 60, .y = 20, .family = LATIN, .size = 87, .color = "#FFFFFF", .shadow = RIGHT_DOWN}},
@@ -121,9 +121,9 @@ std::vector<SampleTitles::Sample> weather()
 {
     std::vector<SampleTitles::Sample> samples;
     samples.push_back(sample("20240101100000001", SampleBackgrounds::lowerThird,
-                             {{"天气预报", {.x = 20, .y = 520, .family = CHINESE, .size = 96, .bold = 1}}}));
+                             {{"天气预报", {.x = 20, .y = 530, .family = CHINESE, .size = 96, .bold = 1}}}));
     samples.push_back(sample("20240101100000002", SampleBackgrounds::lowerThird,
-                             {{"多云 21 °C", {.x = 20, .y = 520, .family = CHINESE, .size = 96}}}));
+                             {{"多云 21 °C", {.x = 20, .y = 530, .family = CHINESE, .size = 96}}}));
     return samples;
 }
 
@@ -146,7 +146,7 @@ std::vector<SampleTitles::Sample> SampleTitles::templates(bool chinese)
                             {.x = chinese ? 500.0F : 260.0F, .y = 280, .family = family, .size = 96}}}));
     made.push_back(
         sample("LowerThird", SampleBackgrounds::lowerThird,
-               {{chinese ? "标题" : "Title Goes Here", {.x = 20, .y = 520, .family = family, .size = 96}}}));
+               {{chinese ? "标题" : "Title Goes Here", {.x = 20, .y = 530, .family = family, .size = 96}}}));
     made.push_back(sample("Stage", SampleBackgrounds::stageLights,
                           {{chinese ? "标题" : "Title Goes Here",
                             {.x = 60, .y = 60, .family = family, .size = 120, .bold = 1, .edgeWidth = 4}}}));

@@ -16,7 +16,8 @@ class ThumbnailRender;
 class TitlerProvision
 {
 public:
-    // basePath ends with "/": the folder that the paths in the path file are relative to.
+    // basePath ends with "/": the folder that the paths in the path file are relative to. It has to be that
+    // of the environment, where the reduction of pictures looks for its checker.
     explicit TitlerProvision(QString basePath);
 
     // The base path that the platform library names; empty when it names none.

@@ -43,6 +43,13 @@ std::vector<std::unique_ptr<Archive>> titlesOf(const QString& folder)
     return titles;
 }
 
+// Makes the folder the data path of the process and gives its base path.
+QString useDataPath(const QTemporaryDir& dir)
+{
+    qputenv("K2SYS_AC_DATA", dir.path().toLocal8Bit());
+    return TitlerProvision::basePathOfEnvironment();
+}
+
 } // namespace
 
 class tst_titlerprovision : public QObject
@@ -69,7 +76,8 @@ private:
 void tst_titlerprovision::initTestCase()
 {
     QVERIFY(mDir.isValid());
-    mBase = mDir.path() + "/defaultuser/";
+    mBase = useDataPath(mDir);
+    QCOMPARE(mBase, mDir.path() + "/defaultuser/");
     TitlerProvision provision(mBase);
     QVERIFY2(provision.writeMissing(), qPrintable(provision.error()));
     for (const QString& path : tree(mBase).keys()) {
@@ -176,7 +184,7 @@ void tst_titlerprovision::templatesAreReadInBothLanguages()
 void tst_titlerprovision::aSecondRunKeepsWhatTheUserMade()
 {
     QTemporaryDir dir;
-    const QString base = dir.path() + "/defaultuser/";
+    const QString base = useDataPath(dir);
     QVERIFY(TitlerProvision(base).writeMissing());
     const QString folder = base + "resources/Titles/Welcome/";
     QFile changed(folder + "20240101090000001.xml");
@@ -198,7 +206,7 @@ void tst_titlerprovision::aSecondRunKeepsWhatTheUserMade()
 void tst_titlerprovision::itIsTheSameEveryTime()
 {
     QTemporaryDir dir;
-    const QString base = dir.path() + "/defaultuser/";
+    const QString base = useDataPath(dir);
     QVERIFY(TitlerProvision(base).writeMissing());
     const QMap<QString, QByteArray> other = tree(base);
     const QMap<QString, QByteArray> first = tree(mBase);
@@ -213,7 +221,7 @@ void tst_titlerprovision::itIsTheSameEveryTime()
 void tst_titlerprovision::anInterruptedRunIsMadeGood()
 {
     QTemporaryDir dir;
-    const QString base = dir.path() + "/defaultuser/";
+    const QString base = useDataPath(dir);
     QVERIFY(QDir().mkpath(base + "resources/Titles.making/Welcome.making"));
     QFile torn(base + "resources/Titles.making/Welcome.making/20240101090000001.xml");
     QVERIFY(torn.open(QIODevice::WriteOnly));
