@@ -6,7 +6,8 @@
 #include <cstdint>
 #include <mutex>
 
-namespace {
+namespace
+{
 constexpr long SERVICE_ID = 36;
 }
 

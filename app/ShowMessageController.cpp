@@ -5,7 +5,8 @@
 #include <QDebug>
 #include <mutex>
 
-namespace {
+namespace
+{
 constexpr long SERVICE_ID = 65;
 }
 

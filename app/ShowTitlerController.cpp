@@ -5,7 +5,8 @@
 #include <QDebug>
 #include <QString>
 
-namespace {
+namespace
+{
 constexpr long SERVICE_ID = 92;
 }
 

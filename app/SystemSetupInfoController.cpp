@@ -4,7 +4,8 @@
 
 #include <mutex>
 
-namespace {
+namespace
+{
 constexpr long SERVICE_ID = 114;
 }
 

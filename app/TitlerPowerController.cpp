@@ -6,7 +6,8 @@
 #include <mutex>
 #include <unistd.h>
 
-namespace {
+namespace
+{
 constexpr long SERVICE_ID = 71;
 }
 

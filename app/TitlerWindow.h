@@ -162,7 +162,6 @@ private:
     void leaveTextEditing(bool deleteEmptyItems);
     void changeMoveMode(bool on);
     void sendTransientControlEvent(bool on);
-    void hideOpenControls();
 
     void showDialogMaskWidget(bool show);
     void showMessageMaskWidget(bool show);

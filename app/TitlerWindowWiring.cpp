@@ -66,6 +66,9 @@ void TitlerWindow::connectForTextToolsAndArchiveList()
     connect(mArchiveList, &ArchiveList::cleanUndoStack, this, &TitlerWindow::clearUndoStack);
     connect(mArchiveList, &ArchiveList::archiveListMenuShow, this,
             &TitlerWindow::hideSoftWareWithDeleteEmptyItems);
+    connect(mArchiveList, &ArchiveList::signalPopupOpen, this, &TitlerWindow::slotShowArchiveMenu);
+    connect(mArchiveList, &ArchiveList::widgetItemReleased, this,
+            &TitlerWindow::hideSoftWareWithOutDeleteEmptyItems);
     connect(mMoveButton, &QPushButton::clicked, this, &TitlerWindow::hideSoftWareWithDeleteEmptyItems);
 }
 
@@ -99,6 +102,8 @@ void TitlerWindow::connectForController()
             &TitlerWindow::slotCancelArchiveListMoveMode);
     connect(mTitlerAPPEventFilterController, &TitlerAPPEventFilterController::signalRestoreOriginal, this,
             &TitlerWindow::slotHideCanvasMenu);
+    connect(mTitlerAPPEventFilterController, &TitlerAPPEventFilterController::signalRestoreOriginal,
+            mArchiveList, &ArchiveList::slotHideOptionMenu);
     connect(MessageBoxController::getInstance(), &MessageBoxController::signalCloseMessage, this,
             &TitlerWindow::continueCloseTitler);
     connect(mShowMessageController, &ShowMessageController::signalsShowDialogMaskWidget, this,

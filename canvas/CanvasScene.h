@@ -7,14 +7,18 @@
 #include <QEvent>
 #include <QGraphicsScene>
 #include <QList>
+#include <QPointer>
 #include <memory>
 
 class Archive;
 class CanvasController;
 class FontStyle;
 class GraphicsPixmap;
+class NewTextStyle;
 class QAction;
 class QUndoCommand;
+class SafeAreaLines;
+class TextObjectList;
 
 namespace SubCommonDefine
 {
@@ -51,7 +55,7 @@ public:
 
     void saveArchive();
     // Marks that the pictures of the title are out of date.
-    void saveArchiveFlag();
+    void saveArchiveFlag() { m_thumbnailNeeded = true; }
     void createThumnailPicture();
     bool isEditFinish() const;
 
@@ -59,7 +63,7 @@ public:
     bool itemIsSelectionMode() const;
     void clearItemsSelectionMode();
     void clearItemsSelectionAndFocus();
-    void disableTextPropertyArea();
+    void disableTextPropertyArea() { Q_EMIT signalSceneNotifyIfExistSelectedObject(false); }
 
     // Deleted objects stay in the scene hidden; every loop over items goes through here.
     QList<QGraphicsItem*> enableItems() const;
@@ -76,13 +80,13 @@ public:
     int initCGraphicsTextItem();
     // Makes, wires and lists a pair that shows the record, for undo.
     GraphicsText* rebuildItem(TText* record, TText& lastAlpha);
-    void setCurrentEditItemId(int id);
+    void setCurrentEditItemId(int id) { m_currentEditItemId = id; }
     int currentEditItemId() const { return m_currentEditItemId; }
     void setModuleInfo(SystemSetupDef::emInformationModel model);
     void slotSceneInputLanguageChanged(SystemSetupDef::emInputLanguageType language);
     void resetLastFontInfo();
 
-    static GraphicsText* getParentItem(GraphicsText* item);
+    static GraphicsText* getParentItem(GraphicsText* item) { return item ? item->parentTextItem() : nullptr; }
     bool isTheSame(TText* style) const;
     static int getItemTextEditId(int status, bool overall, bool same);
     QString getDataInfo(const SubCommonDefine::tagSoftKeyBoardInitData& data) const;
@@ -100,13 +104,13 @@ public:
 public Q_SLOTS:
     void addCGraphicsTextItem();
     void slotObjectLostFocus(GraphicsText* item);
-    void slotInsertNewTextItem();
+    void slotInsertNewTextItem() { addCGraphicsTextItem(); }
     void slotChangeObjectTextStyle(TText* style, int id, int undoFlag);
     // Shows a copy of the title; null empties the canvas.
     void slotUpdateArchive(const Archive* archive);
-    void slotObjectContentsChange();
+    void slotObjectContentsChange() { m_contentsChanged = true; }
     void slotCreateMoveUndoCommand(int id, QPointF from, QPointF to);
-    void slotSetCurrentMousePressedObjectId(int id);
+    void slotSetCurrentMousePressedObjectId(int id) { m_currentPressedObjectId = id; }
     void slotCreateEditUndoCommand(TText* oldText, TText* newText, TText* oldLast, TText* newLast);
     void slotMakeSceneThumnail();
     void slotDrawSafeArea(bool draw);
@@ -117,7 +121,7 @@ public Q_SLOTS:
     void slotShowMessageWhenUsingDefaultFont(QString family);
     void slotSaveArchive(GraphicsText* item);
     void slotSetItemInputlanguage(GraphicsText* item);
-    void slotNotifyEditAreaSizeToolBoxEditDone();
+    void slotNotifyEditAreaSizeToolBoxEditDone() {}
 
 Q_SIGNALS:
     void signalTextInserted();
@@ -147,55 +151,40 @@ protected:
     void customEvent(QEvent* event) override;
 
 private:
-    void changeTextStyleToTText();
     void savePreviousArchiveInfo();
     bool archiveIsNull(const Archive* archive);
-    void showTextObjects();
     void reportMissingFamily();
-    GraphicsText* buildPair(TText* record, double x, double y, double z);
+    GraphicsText* buildPair(TText* record);
+    void pushCommand(QUndoCommand* command);
     void addCGraphicsPixmapItem(const QString& path, QPointF position, double z);
-    void initItemTextDataWithLastTextStyle(TText& record) const;
     int initItemLastAlphaStyleWithLastTextStyle(TText& record);
-    int getNewItemTextObjectId() const;
     QPointF getInitItemScenePosition();
-    double getTextObjectMaxZValue() const;
-    void setValueForLastTextStyle(TText* style);
-    GraphicsText* findTheActiveItem() const;
     void changeItemTextStyleAccordingToItemStatus(GraphicsText* item, TText* style, int id, int mode,
                                                   bool overall, int undoFlag);
-    void changeItemFocusStatus();
-    static void releaseItem(GraphicsText* item);
-    static void restoreZ(GraphicsText* item);
     void pushDeleteCommand(GraphicsText* item);
     void saveArchiveXML(const QString& path);
     void openKeyboardForItem(GraphicsText* item);
-    static int getCursorSelectionStartPosition(GraphicsText* item);
-    void replaceLastFontWithCNDefaultLanguageFont();
-    void replaceLastFontWithSYDefaultLanguageFont();
 
-    GraphicsText* m_currentItem = nullptr;
-    QList<GraphicsText*> m_textItems;
+    QPointer<GraphicsText> m_currentItem;
     // Owned by the scene's item tree.
     GraphicsPixmap* m_currentPixmapItem = nullptr;
     std::unique_ptr<Archive> m_archive;
-    bool m_hasArchive = false;
     std::unique_ptr<CanvasController> m_controller;
     std::unique_ptr<FontStyle> m_defaultFontStyle;
-    // What the panel sent last, and what it last announced for new objects.
-    std::unique_ptr<TText> m_lastTextStyle;
-    std::unique_ptr<TText> m_currentTextProperty;
+    std::unique_ptr<NewTextStyle> m_newTextStyle;
     bool m_contentsChanged = false;
-    GraphicsText* m_itemForKeyboard = nullptr;
+    QPointer<GraphicsText> m_itemForKeyboard;
     int m_currentEditItemId = -1;
     int m_currentPressedObjectId = -1;
     std::unique_ptr<IThumbnailRender> m_thumbnailRender;
     bool m_drawSafeArea = false;
-    QList<QGraphicsRectItem*> m_safeAreaItems;
+    std::unique_ptr<TextObjectList> m_texts;
+    std::unique_ptr<SafeAreaLines> m_safeArea;
     int m_newTextFlag = 0;
     bool m_defaultFontUsed = false;
     QString m_missingFamily;
     bool m_cnFamilyFlag = false;
-    GraphicsText* m_currentParentItem = nullptr;
+    QPointer<GraphicsText> m_currentParentItem;
     int m_languageRow = 4;
     bool m_languageChanged = false;
     int m_topZ = 0;

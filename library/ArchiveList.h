@@ -50,6 +50,9 @@ public:
     // 0 off, 1 on.
     int getMoveState() const { return mMoveMode; }
 
+    // Opens the last folder, or else the first one; its titles follow from a thread of their own.
+    void initArchiveList();
+
     // Selects the item and shows it on the canvas; an index outside the list clears both.
     void selectArchive(int index);
     // Moves the border to the item.
@@ -134,7 +137,6 @@ public slots:
 
 private:
     void initArchiveListConnect();
-    void initArchiveList();
     void initArchiveListData();
     void initArchiveListRefreshData();
     void endInitThread();

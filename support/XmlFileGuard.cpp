@@ -145,8 +145,10 @@ private:
             }
             if (startsWithIgnoringCase("version") || startsWithIgnoringCase("encoding") ||
                 startsWithIgnoringCase("standalone")) {
-                if (!scanAttribute())
-                    return false;
+                if (!scanAttribute()) { // TinyXML ends here, and is content outside the root
+                    mIsDone = true;
+                    return mDepth == 0;
+                }
             } else {
                 while (mPos != mEnd && *mPos != '>' && !isSpace(*mPos))
                     ++mPos;

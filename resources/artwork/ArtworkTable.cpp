@@ -37,10 +37,10 @@ void addToolIcons(QList<Picture>& table)
         bool hasDisabled;
     };
     const ToolIcon icons[] = {
-        {"Folder", Icons::folder, true},  {"Text", Icons::newText, true},
-        {"Delete", Icons::trash, true},   {"Undo", Icons::undo, true},
-        {"Redo", Icons::redo, true},      {"SafeArea", Icons::safeArea, false},
-        {"Canvas", Icons::canvas, false}, {"Close", Icons::close, false},
+        {"Folder", Icons::folder, true},      {"Text", Icons::newText, true},
+        {"Delete", Icons::trash, true},       {"Undo", Icons::undo, true},
+        {"Redo", Icons::redo, true},          {"SafeArea", Icons::safeArea, false},
+        {"Canvas", Icons::canvasMenu, false}, {"Close", Icons::close, false},
     };
     for (const ToolIcon& icon : icons) {
         const auto at = [draw = icon.draw](const QColor& color) {
@@ -65,6 +65,10 @@ void addButtonFamily(QList<Picture>& table, const QString& rest, const QString& 
     for (const ButtonRow& row : BUTTON_ROWS) {
         const QString name = QString::fromLatin1(row.name);
         const bool isSelected = name.startsWith(QLatin1String("selected"));
+        if (draw == Surfaces::toolPlate &&
+            (row.state == Button::Rest || name.endsWith(QLatin1String("Disabled")))) {
+            continue; // nothing is behind the icon
+        }
         const QString base = isSelected ? selected + name.mid(8) : rest + name;
         addThreeSlice(table, TOOL_COLLECTION,
                       {base + QStringLiteral("_Left"), base + QStringLiteral("_Center"),

@@ -120,9 +120,11 @@ void Icons::safeArea(QPainter& painter, const QColor& color)
     painter.drawRect(QRectF(8, 12, 20, 12));
 }
 
-void Icons::canvas(QPainter& painter, const QColor& color)
+void Icons::canvasMenu(QPainter& painter, const QColor& color)
 {
     begin(painter, color);
+    painter.translate(-8, 0);
+    painter.drawPolyline(QPolygonF({QPointF(41, 16), QPointF(46, 21), QPointF(51, 16)}));
     const QRectF frame(2, 6, 32, 24);
     painter.fillRect(QRectF(3, 7, 10, 11), color);
     painter.fillRect(QRectF(13, 18, 10, 11), color);

@@ -17,7 +17,9 @@ void trash(QPainter& painter, const QColor& color);
 void undo(QPainter& painter, const QColor& color);
 void redo(QPainter& painter, const QColor& color);
 void safeArea(QPainter& painter, const QColor& color);
-void canvas(QPainter& painter, const QColor& color);
+// The canvas with the sign of a menu beside it; together they are wider than the box, and moved left to stay
+// centred.
+void canvasMenu(QPainter& painter, const QColor& color);
 void close(QPainter& painter, const QColor& color);
 
 } // namespace Icons

@@ -65,9 +65,7 @@ void Surfaces::button(QPainter& painter, const QSize& size, Button state)
 
 void Surfaces::toolPlate(QPainter& painter, const QSize& size, Button state)
 {
-    if (state != Button::Rest && state != Button::Disabled && state != Button::SelectedDisabled) {
-        drawFace(painter, size, faceOf(state), Tokens::RADIUS_PANE);
-    }
+    drawFace(painter, size, faceOf(state), Tokens::RADIUS_PANE);
 }
 
 void Surfaces::pane(QPainter& painter, const QSize& size, const QColor& fill)

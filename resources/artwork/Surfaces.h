@@ -13,7 +13,7 @@ namespace Surfaces
 enum class Button { Rest, Pressed, Disabled, SelectedRest, SelectedPressed, SelectedDisabled };
 
 void button(QPainter& painter, const QSize& size, Button state);
-// The plate behind a button of the tools bar: only what differs from rest shows.
+// The plate behind a button of the tools bar, which has none at rest.
 void toolPlate(QPainter& painter, const QSize& size, Button state);
 void pane(QPainter& painter, const QSize& size, const QColor& fill);
 void dialog(QPainter& painter, const QSize& size);

@@ -41,6 +41,20 @@ public:
                         "<Template path=\"templates\"/><Font path=\"fonts\"/></PathInfo>");
         QDir().mkpath(base + QStringLiteral("titles"));
         QDir().mkpath(base + QStringLiteral("settings"));
+        QDir().mkpath(base + QStringLiteral("resources/Templates"));
+        checker().save(base + QStringLiteral("resources/Templates/checker_240x135.png"));
+    }
+
+    // What lies under the small pictures.
+    static QImage checker()
+    {
+        QImage image(240, 135, QImage::Format_RGB32);
+        for (int y = 0; y < image.height(); ++y) {
+            for (int x = 0; x < image.width(); ++x)
+                image.setPixelColor(x, y,
+                                    (x / 15 + y / 15) % 2 ? QColor(153, 153, 153) : QColor(102, 102, 102));
+        }
+        return image;
     }
 
     QString titleRoot() const { return mDir.path() + QStringLiteral("/defaultuser/titles"); }

@@ -124,6 +124,8 @@ void tst_PictureThread::transparentParts()
     const QImage black(folder + QStringLiteral("/t_240S.png"));
     QVERIFY(!black.hasAlphaChannel());
     QCOMPARE(black.pixelColor(3, 3), QColor(Qt::black));
+    const QImage small = QImage(folder + QStringLiteral("/t_240.png")).convertToFormat(QImage::Format_RGB32);
+    QCOMPARE(small, LibraryFixture::checker());
 }
 
 void tst_PictureThread::jobQueuedAtTheEndIsNeverWritten()

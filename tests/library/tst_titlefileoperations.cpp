@@ -137,6 +137,7 @@ void tst_TitleFileOperations::copySurvivesItsSource()
     const auto source = LibraryFixture::makeRecord(folder, QStringLiteral("s"), QStringLiteral("Copy me"));
     for (const char* name : {"/s_1920.png", "/s_960.png", "/s_240.png", "/s_240S.png"})
         writeFile(folder + QLatin1String(name), name);
+    LibraryFixture::fillFolder(folder, {QStringLiteral("other")});
     QVERIFY(mController.saveNewArchive(folder, source.get()));
     const TitlePictures pictures = TitleFileOperations::loadPictures(*source);
     QVERIFY(mController.deleteArchive(QString::fromStdString(source->getPath())));
