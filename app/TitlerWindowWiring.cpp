@@ -10,6 +10,7 @@
 #include "app/TitlerPowerController.h"
 #include "app/ToolsBar.h"
 #include "canvas/CanvasScene.h"
+#include "library/ArchiveItem.h"
 #include "library/ArchiveList.h"
 #include "touchui/KSPushbutton.h"
 
@@ -66,7 +67,6 @@ void TitlerWindow::connectForTextToolsAndArchiveList()
     connect(mArchiveList, &ArchiveList::cleanUndoStack, this, &TitlerWindow::clearUndoStack);
     connect(mArchiveList, &ArchiveList::archiveListMenuShow, this,
             &TitlerWindow::hideSoftWareWithDeleteEmptyItems);
-    connect(mArchiveList, &ArchiveList::signalPopupOpen, this, &TitlerWindow::slotShowArchiveMenu);
     connect(mArchiveList, &ArchiveList::widgetItemReleased, this,
             &TitlerWindow::hideSoftWareWithOutDeleteEmptyItems);
     connect(mMoveButton, &QPushButton::clicked, this, &TitlerWindow::hideSoftWareWithDeleteEmptyItems);
@@ -102,8 +102,6 @@ void TitlerWindow::connectForController()
             &TitlerWindow::slotCancelArchiveListMoveMode);
     connect(mTitlerAPPEventFilterController, &TitlerAPPEventFilterController::signalRestoreOriginal, this,
             &TitlerWindow::slotHideCanvasMenu);
-    connect(mTitlerAPPEventFilterController, &TitlerAPPEventFilterController::signalRestoreOriginal,
-            mArchiveList, &ArchiveList::slotHideOptionMenu);
     connect(MessageBoxController::getInstance(), &MessageBoxController::signalCloseMessage, this,
             &TitlerWindow::continueCloseTitler);
     connect(mShowMessageController, &ShowMessageController::signalsShowDialogMaskWidget, this,

@@ -4,6 +4,7 @@
 #include "canvas/StyleDocument.h"
 #include "canvas/TextPainter.h"
 
+#include <QMimeData>
 #include <QClipboard>
 #include <QGraphicsDropShadowEffect>
 #include <QGraphicsScene>
