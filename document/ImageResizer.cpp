@@ -1,0 +1,178 @@
+#include "document/ImageResizer.h"
+
+#include "document/PngWriter.h"
+#include "support/LocaleText.h"
+#include "support/k2sys/k2sys.h"
+
+#include <QPainter>
+#include <algorithm>
+#include <boost/filesystem.hpp>
+#include <mutex>
+
+std::string ImageResizer::checkerFname_in_title;
+std::string ImageResizer::checkerFname_in_logo;
+
+namespace
+{
+
+constexpr int REDUCTION = 4;
+
+std::mutex gCheckerMutex;
+
+std::wstring extensionOf(const std::wstring& path)
+{
+    const std::size_t slash = path.rfind(L'/');
+    const std::size_t dot = path.rfind(L'.');
+    const bool isInName = dot != std::wstring::npos && (slash == std::wstring::npos || dot > slash);
+    return isInName ? path.substr(dot) : std::wstring();
+}
+
+QImage loadImage(const std::wstring& path)
+{
+    return QImage(QString::fromStdWString(path));
+}
+
+// The reduction works on colour bytes, and a palette cannot be painted on.
+QImage with32Bits(const QImage& image)
+{
+    if (image.isNull() || image.format() == QImage::Format_RGB32 || image.format() == QImage::Format_ARGB32)
+        return image;
+    return image.convertToFormat(image.hasAlphaChannel() ? QImage::Format_ARGB32 : QImage::Format_RGB32);
+}
+
+} // namespace
+
+ImageResizer::ImageResizer()
+{
+    char root[1024] = {};
+    char data[1024] = {};
+    std::string base;
+    if (k2sys_getenv_ac_root(root, sizeof root) >= 0 && k2sys_getenv_ac_data(data, sizeof data) >= 0)
+        base = QString::fromLocal8Bit(std::string(root).append(data).c_str()).trimmed().toStdString();
+    const std::lock_guard lock(gCheckerMutex);
+    checkerFname_in_title = base + "/defaultuser/resources/Templates/checker_240x135.png";
+    checkerFname_in_logo = base + "/defaultuser/resources/Templates/checker_135x135.png";
+}
+
+bool ImageResizer::resizeImageToThumbnail(std::wstring& source, std::wstring& blackPath,
+                                          std::wstring& smallPath, unsigned width, unsigned height)
+{
+    return resizeImageToThumbnail(loadImage(source), blackPath, smallPath, width, height);
+}
+
+bool ImageResizer::resizeImageToThumbnail(const QImage& source, const std::wstring& blackPath,
+                                          const std::wstring& smallPath, unsigned width, unsigned height)
+{
+    QImage picture = with32Bits(source);
+    QImage reduced(static_cast<int>(width), static_cast<int>(height), QImage::Format_ARGB32);
+    reduced.fill(Qt::transparent);
+    scaledToQuaterSizeWithAAF(picture, reduced);
+    if (!picture.hasAlphaChannel()) {
+        const bool isBlackSaved = resizeImageToThumbnailImageWithNotAlpha(blackPath, reduced);
+        return resizeImageToThumbnailTitlerWithNotAlpha(smallPath, reduced) && isBlackSaved;
+    }
+    const bool isBlackSaved = resizeImageToThumbnailImageWithAlpha(blackPath, reduced);
+    QString checkerPath;
+    {
+        const std::lock_guard lock(gCheckerMutex);
+        checkerPath = QString::fromStdString(checkerFname_in_title);
+    }
+    QImage checker = with32Bits(QImage(checkerPath));
+    if (!checker.isNull()) {
+        QPainter painter(&checker);
+        painter.setCompositionMode(QPainter::CompositionMode_SourceOver);
+        painter.drawImage(0, 0, reduced);
+    }
+    return resizeImageToThumbnailTitlerWithAlpha(smallPath, checker) && isBlackSaved;
+}
+
+void ImageResizer::scaledToQuaterSizeWithAAF(QImage& source, QImage& target)
+{
+    if (source.depth() != 32 || target.depth() != 32)
+        return;
+    const int columns = std::min(source.width() / REDUCTION, target.width());
+    const int rows = std::min(source.height() / REDUCTION, target.height());
+    for (int row = 0; row < rows; ++row) {
+        const uchar* first = source.constScanLine(row * REDUCTION);
+        const uchar* second = source.constScanLine(row * REDUCTION + 1);
+        auto* out = reinterpret_cast<QRgb*>(target.scanLine(row));
+        for (int column = 0; column < columns; ++column) {
+            unsigned sums[4] = {};
+            for (int i = 0; i < REDUCTION * 4; ++i)
+                sums[i % 4] += first[i] + second[i];
+            first += REDUCTION * 4;
+            second += REDUCTION * 4;
+            // Blue, green, red, alpha as they lie in memory.
+            out[column] = qRgba(static_cast<int>(sums[2] >> 3), static_cast<int>(sums[1] >> 3),
+                                static_cast<int>(sums[0] >> 3), static_cast<int>(sums[3] >> 3));
+        }
+    }
+}
+
+bool ImageResizer::resizeImageToThumbnailImageWithNotAlpha(const std::wstring& path, const QImage& reduced)
+{
+    return save(reduced.convertToFormat(QImage::Format_RGB32), path);
+}
+
+bool ImageResizer::resizeImageToThumbnailTitlerWithNotAlpha(const std::wstring& path, const QImage& reduced)
+{
+    return save(reduced.convertToFormat(QImage::Format_RGB32), path);
+}
+
+bool ImageResizer::resizeImageToThumbnailImageWithAlpha(const std::wstring& path, const QImage& reduced)
+{
+    // Drops the alpha and keeps the colours: what was transparent shows the colour stored there.
+    return save(reduced.convertToFormat(QImage::Format_RGB32), path);
+}
+
+bool ImageResizer::resizeImageToThumbnailTitlerWithAlpha(const std::wstring& path, const QImage& composed)
+{
+    return save(composed, path);
+}
+
+bool ImageResizer::save(const QImage& image, const std::wstring& path)
+{
+    if (!checkJPE(path))
+        return PngWriter::save(image, QString::fromStdWString(path));
+    // Qt chooses the format by the extension and does not know this one.
+    const std::wstring alternative = changeJPEToJPEG(path);
+    boost::system::error_code error;
+    boost::filesystem::remove(wideToMultiByte(alternative), error);
+    if (!PngWriter::save(image, QString::fromStdWString(alternative)))
+        return false;
+    boost::filesystem::rename(wideToMultiByte(alternative), wideToMultiByte(path), error);
+    return true;
+}
+
+bool ImageResizer::isAvailableImage(std::wstring path)
+{
+    return loadImage(path).format() != QImage::Format_Invalid;
+}
+
+int ImageResizer::getImageWidth(std::wstring& path)
+{
+    return loadImage(path).width();
+}
+
+int ImageResizer::getImageHeight(std::wstring& path)
+{
+    return loadImage(path).height();
+}
+
+bool ImageResizer::checkJPE(std::wstring path)
+{
+    const std::wstring extension = extensionOf(path);
+    static constexpr std::wstring_view JPE = L".jpe";
+    return std::equal(extension.begin(), extension.end(), JPE.begin(), JPE.end(), [](wchar_t a, wchar_t b) {
+        return a == b || (a >= L'A' && a <= L'Z' && a - L'A' + L'a' == b);
+    });
+}
+
+std::wstring ImageResizer::changeJPEToJPEG(std::wstring path)
+{
+    const std::wstring extension = extensionOf(path);
+    const std::size_t last = path.find_last_of(extension);
+    if (extension.empty() || last == std::wstring::npos)
+        return {};
+    return path.substr(0, last) + L".jpeg";
+}

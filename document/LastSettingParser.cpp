@@ -1,0 +1,56 @@
+#include "document/LastSettingParser.h"
+
+#include "document/DocumentConstants.h"
+#include "document/TitleParserUtility.h"
+#include "support/IPathManagerEx.h"
+#include "support/XmlFile.h"
+
+#include <tinyxml.h>
+
+LastSettingParser::LastSettingParser(std::string folder)
+{
+    if (folder.empty())
+        folder = TitleParserUtility::wstring2String(IPathManagerEx::getInstance()->getSystemSettingPath());
+    if (!folder.empty())
+        mFilePath = folder + TEMP_FILENAME;
+}
+
+bool LastSettingParser::createTempFile(const std::string& element, const std::string& attribute,
+                                       const std::string& value)
+{
+    TiXmlDocument document;
+    document.LinkEndChild(new TiXmlDeclaration(XML_VERSION, XML_ENCODING, STR_EMPTY));
+    auto* root = new TiXmlElement(TEMP_ROOT); // linked elements belong to the document
+    root->SetAttribute(TEMP_TYPE, TEMP_TYPE_VAL);
+    document.LinkEndChild(root);
+    auto* entry = new TiXmlElement(element);
+    entry->SetAttribute(attribute, value);
+    root->LinkEndChild(entry);
+    return XmlFile::save(document, mFilePath);
+}
+
+bool LastSettingParser::editTempFile(const std::string& element, const std::string& attribute,
+                                     const std::string& value)
+{
+    TiXmlDocument document;
+    if (!XmlFile::load(mFilePath, document))
+        return createTempFile(element, attribute, value);
+    TiXmlElement* root = document.RootElement();
+    if (!root)
+        return false;
+    TiXmlElement* entry = root->FirstChildElement(element);
+    if (!entry) {
+        entry = new TiXmlElement(element);
+        root->LinkEndChild(entry);
+    }
+    entry->SetAttribute(attribute, value);
+    return XmlFile::save(document, mFilePath);
+}
+
+std::string LastSettingParser::getTempAttribute(const std::string& element, const std::string& attribute)
+{
+    TiXmlDocument document;
+    if (!XmlFile::load(mFilePath, document) || !document.RootElement())
+        return {};
+    return TitleParserUtility::getAttribute(document.RootElement()->FirstChildElement(element), attribute);
+}

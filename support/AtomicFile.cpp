@@ -1,0 +1,199 @@
+#include "support/AtomicFile.h"
+
+#include "support/FileSyncQueue.h"
+#include "support/HiddenName.h"
+
+#include <cerrno>
+#include <climits>
+#include <cstdlib>
+#include <fcntl.h>
+#include <filesystem>
+#include <sys/stat.h>
+#include <sys/syscall.h>
+#include <unistd.h>
+
+namespace
+{
+
+// A file descriptor that closes itself.
+class Descriptor
+{
+public:
+    explicit Descriptor(int descriptor) : mDescriptor(descriptor) {}
+    Descriptor(const Descriptor&) = delete;
+    Descriptor& operator=(const Descriptor&) = delete;
+    ~Descriptor() { close(); }
+
+    int get() const { return mDescriptor; }
+    bool isOpen() const { return mDescriptor >= 0; }
+
+    bool close()
+    {
+        const int descriptor = mDescriptor;
+        mDescriptor = -1;
+        return descriptor < 0 || ::close(descriptor) == 0;
+    }
+
+private:
+    int mDescriptor;
+};
+
+bool isMainThread()
+{
+    return ::syscall(SYS_gettid) == ::getpid();
+}
+
+bool writeAll(int descriptor, std::string_view bytes)
+{
+    while (!bytes.empty()) {
+        const ssize_t written = ::write(descriptor, bytes.data(), bytes.size());
+        if (written < 0 && errno == EINTR)
+            continue;
+        if (written <= 0)
+            return false;
+        bytes.remove_prefix(static_cast<std::size_t>(written));
+    }
+    return true;
+}
+
+bool copyAll(int from, int to)
+{
+    char buffer[64 * 1024];
+    for (;;) {
+        const ssize_t count = ::read(from, buffer, sizeof buffer);
+        if (count < 0 && errno == EINTR)
+            continue;
+        if (count <= 0)
+            return count == 0;
+        if (!writeAll(to, {buffer, static_cast<std::size_t>(count)}))
+            return false;
+    }
+}
+
+void syncFolder(const std::string& folder)
+{
+    const Descriptor descriptor(::open(folder.c_str(), O_RDONLY | O_DIRECTORY | O_CLOEXEC));
+    if (descriptor.isOpen())
+        ::fsync(descriptor.get());
+}
+
+// The file that a path leads to, and what is there now.
+struct Target {
+    std::string path;
+    struct stat status = {};
+    bool exists = false;
+};
+
+bool resolve(const std::string& path, Target& target)
+{
+    if (path.empty() || path.find('\0') != std::string::npos)
+        return false;
+    target.path = std::filesystem::path(path).lexically_normal().native();
+    if (::lstat(target.path.c_str(), &target.status) != 0)
+        return errno == ENOENT;
+    target.exists = true;
+    if (!S_ISLNK(target.status.st_mode))
+        return true;
+    char resolved[PATH_MAX];
+    if (!::realpath(path.c_str(), resolved))
+        return false;
+    target.path = resolved;
+    return ::stat(resolved, &target.status) == 0;
+}
+
+Descriptor openTemporary(const Target& target, std::string& name)
+{
+    const std::string folder = HiddenName::folderOf(target.path);
+    int descriptor = -1;
+    do {
+        name = HiddenName::temporary(folder);
+        descriptor = ::open(name.c_str(), O_WRONLY | O_CREAT | O_EXCL | O_CLOEXEC, 0666);
+    } while (descriptor < 0 && (errno == EEXIST || errno == EINTR));
+    if (descriptor >= 0 && target.exists) {
+        if (target.status.st_uid != ::geteuid() || target.status.st_gid != ::getegid()) {
+            // Only root can hand a file over; anyone else becomes the owner of what he saves.
+            if (::fchown(descriptor, target.status.st_uid, target.status.st_gid) != 0)
+                errno = 0;
+        }
+        ::fchmod(descriptor, target.status.st_mode & 07777);
+    }
+    return Descriptor(descriptor);
+}
+
+// Makes the new file by fill(descriptor) and puts it in the place of the old one.
+template <typename Fill>
+bool replaceFile(const std::string& path, AtomicFile::Durability durability, Fill fill)
+{
+    Target target;
+    if (!resolve(path, target))
+        return false;
+    if (target.exists) {
+        if (S_ISDIR(target.status.st_mode))
+            return false;
+        if (!S_ISREG(target.status.st_mode)) { // a device takes the bytes as they come
+            Descriptor device(::open(target.path.c_str(), O_WRONLY | O_CLOEXEC | O_NONBLOCK));
+            return device.isOpen() && fill(device.get()) && device.close();
+        }
+        if (::faccessat(AT_FDCWD, target.path.c_str(), W_OK, AT_EACCESS) != 0)
+            return false;
+    }
+    if (durability == AtomicFile::Durability::Automatic)
+        durability = isMainThread() ? AtomicFile::Durability::SyncLater : AtomicFile::Durability::SyncNow;
+    const bool isNow = durability == AtomicFile::Durability::SyncNow;
+
+    std::string temporary;
+    Descriptor descriptor = openTemporary(target, temporary);
+    if (!descriptor.isOpen())
+        return false;
+    bool isDone = fill(descriptor.get()) && (!isNow || ::fdatasync(descriptor.get()) == 0);
+    isDone = descriptor.close() && isDone;
+    if (isDone) {
+        isDone = isNow ? FileSyncQueue::publishSynced(temporary, target.path)
+                       : FileSyncQueue::publish(temporary, target.path);
+    }
+    if (!isDone)
+        ::unlink(temporary.c_str());
+    else if (isNow)
+        syncFolder(HiddenName::folderOf(target.path));
+    return isDone;
+}
+
+} // namespace
+
+bool AtomicFile::write(const std::string& path, std::string_view bytes, Durability durability)
+{
+    return replaceFile(path, durability, [bytes](int descriptor) { return writeAll(descriptor, bytes); });
+}
+
+bool AtomicFile::copy(const std::string& source, const std::string& target, Durability durability)
+{
+    const Descriptor from(::open(source.c_str(), O_RDONLY | O_CLOEXEC | O_NONBLOCK));
+    struct stat status = {};
+    if (!from.isOpen() || ::fstat(from.get(), &status) != 0 || !S_ISREG(status.st_mode))
+        return false;
+    return replaceFile(target, durability,
+                       [&from](int descriptor) { return copyAll(from.get(), descriptor); });
+}
+
+bool AtomicFile::read(const std::string& path, std::size_t maximum, std::string& bytes)
+{
+    const Descriptor descriptor(::open(path.c_str(), O_RDONLY | O_CLOEXEC | O_NONBLOCK));
+    struct stat status = {};
+    if (!descriptor.isOpen() || ::fstat(descriptor.get(), &status) != 0 || !S_ISREG(status.st_mode) ||
+        static_cast<std::uintmax_t>(status.st_size) > maximum)
+        return false;
+    bytes.resize(static_cast<std::size_t>(status.st_size));
+    std::size_t size = 0;
+    while (size < bytes.size()) {
+        const ssize_t count = ::read(descriptor.get(), bytes.data() + size, bytes.size() - size);
+        if (count < 0 && errno == EINTR)
+            continue;
+        if (count < 0)
+            return false;
+        if (count == 0)
+            break;
+        size += static_cast<std::size_t>(count);
+    }
+    bytes.resize(size);
+    return true;
+}

@@ -1,0 +1,57 @@
+#include "support/Utf8.h"
+
+#include <cstdint>
+#include <cstring>
+
+namespace
+{
+
+bool isContinuation(unsigned char byte)
+{
+    return (byte & 0xC0) == 0x80;
+}
+
+// Length of the well-formed sequence at p, whose lead byte is not ASCII; 0 when there is none.
+int sequenceLength(const unsigned char* p, const unsigned char* end)
+{
+    const unsigned char lead = *p;
+    const int length = lead >= 0xF0 ? 4 : lead >= 0xE0 ? 3 : 2;
+    if (lead < 0xC2 || lead > 0xF4 || end - p < length)
+        return 0;
+    char32_t code = lead & (0xFF >> (length + 1));
+    for (int i = 1; i < length; ++i) {
+        if (!isContinuation(p[i]))
+            return 0;
+        code = (code << 6) | (p[i] & 0x3F);
+    }
+    const bool isOverlong = (length == 3 && code < 0x800) || (length == 4 && code < 0x10000);
+    const bool isSurrogate = code >= 0xD800 && code <= 0xDFFF;
+    return isOverlong || isSurrogate || code > 0x10FFFF ? 0 : length;
+}
+
+} // namespace
+
+bool Utf8::isValid(std::string_view bytes)
+{
+    const auto* p = reinterpret_cast<const unsigned char*>(bytes.data());
+    const unsigned char* const end = p + bytes.size();
+    while (p != end) {
+        std::uint64_t block[2];
+        if (end - p >= static_cast<std::ptrdiff_t>(sizeof block)) {
+            std::memcpy(block, p, sizeof block);
+            if (((block[0] | block[1]) & 0x8080808080808080u) == 0) {
+                p += sizeof block;
+                continue;
+            }
+        }
+        if (*p < 0x80) {
+            ++p;
+            continue;
+        }
+        const int length = sequenceLength(p, end);
+        if (length == 0)
+            return false;
+        p += length;
+    }
+    return true;
+}

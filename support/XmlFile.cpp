@@ -1,0 +1,206 @@
+#include "support/XmlFile.h"
+
+#include "support/AtomicFile.h"
+#include "support/FileSyncQueue.h"
+#include "support/XmlFileGuard.h"
+
+#include <cstdio>
+#include <cstdlib>
+#include <string_view>
+#include <tinyxml.h>
+
+namespace
+{
+
+constexpr std::string_view BYTE_ORDER_MARK = "\xEF\xBB\xBF";
+
+// TinyXML writes a byte order mark again that it read, but does not tell of it: the document's user data
+// does.
+char gMarked;
+
+// Line ends become single line feeds.
+void normaliseLineEnds(std::string& bytes)
+{
+    std::size_t from = bytes.find('\r');
+    if (from == std::string::npos)
+        return;
+    std::size_t to = from;
+    for (; from < bytes.size(); ++from) {
+        if (bytes[from] == '\r') {
+            bytes[to++] = '\n';
+            if (from + 1 < bytes.size() && bytes[from + 1] == '\n')
+                ++from;
+        } else {
+            bytes[to++] = bytes[from];
+        }
+    }
+    bytes.resize(to);
+}
+
+// Writes a document as TinyXML prints it. Elements and their attributes, of which the files consist, are
+// written here, without TinyXML's formatted output for every attribute; the rare other nodes print
+// themselves.
+class Printer
+{
+public:
+    std::string take() { return std::move(mBytes); }
+
+    void print(const TiXmlDocument& document)
+    {
+        if (document.GetUserData() == &gMarked)
+            mBytes += BYTE_ORDER_MARK;
+        for (const TiXmlNode* node = document.FirstChild(); node; node = node->NextSibling()) {
+            print(*node, 0);
+            mBytes += '\n';
+        }
+    }
+
+private:
+    void print(const TiXmlNode& node, int depth)
+    {
+        if (const TiXmlElement* element = node.ToElement()) {
+            printElement(*element, depth);
+            return;
+        }
+        char* text = nullptr;
+        std::size_t size = 0;
+        if (std::FILE* const stream = ::open_memstream(&text, &size)) {
+            node.Print(stream, depth);
+            std::fclose(stream);
+            mBytes.append(text, size);
+            std::free(text);
+        }
+    }
+
+    void printElement(const TiXmlElement& element, int depth)
+    {
+        indent(depth);
+        mBytes += '<';
+        mBytes += element.ValueStr();
+        for (const TiXmlAttribute* attribute = element.FirstAttribute(); attribute;
+             attribute = attribute->Next()) {
+            mBytes += ' ';
+            printAttribute(*attribute);
+        }
+        const TiXmlNode* const first = element.FirstChild();
+        if (!first) {
+            mBytes += " />";
+            return;
+        }
+        mBytes += '>';
+        if (first == element.LastChild() && first->ToText()) {
+            print(*first, depth + 1);
+        } else {
+            for (const TiXmlNode* node = first; node; node = node->NextSibling()) {
+                if (!node->ToText())
+                    mBytes += '\n';
+                print(*node, depth + 1);
+            }
+            mBytes += '\n';
+            indent(depth);
+        }
+        mBytes += "</";
+        mBytes += element.ValueStr();
+        mBytes += '>';
+    }
+
+    void printAttribute(const TiXmlAttribute& attribute)
+    {
+        const std::string& value = attribute.ValueStr();
+        const char quote = value.find('"') == std::string::npos ? '"' : '\'';
+        append(attribute.NameTStr());
+        mBytes += '=';
+        mBytes += quote;
+        append(value);
+        mBytes += quote;
+    }
+
+    // As TiXmlBase::EncodeString, but for "&#x" in a text, which that one writes as it stands and no reader
+    // would read back.
+    void append(const std::string& text)
+    {
+        static constexpr char DIGITS[] = "0123456789ABCDEF";
+        std::size_t done = 0;
+        for (std::size_t i = 0; i < text.size(); ++i) {
+            const auto c = static_cast<unsigned char>(text[i]);
+            if (!isReserved(c))
+                continue;
+            mBytes.append(text, done, i - done);
+            done = i + 1;
+            switch (c) {
+            case '&':
+                mBytes += "&amp;";
+                break;
+            case '<':
+                mBytes += "&lt;";
+                break;
+            case '>':
+                mBytes += "&gt;";
+                break;
+            case '"':
+                mBytes += "&quot;";
+                break;
+            case '\'':
+                mBytes += "&apos;";
+                break;
+            default:
+                mBytes += "&#x";
+                mBytes += DIGITS[c >> 4];
+                mBytes += DIGITS[c & 15];
+                mBytes += ';';
+            }
+        }
+        mBytes.append(text, done);
+    }
+
+    static bool isReserved(unsigned char c)
+    {
+        return c < 32 || c == '&' || c == '<' || c == '>' || c == '"' || c == '\'';
+    }
+
+    void indent(int depth) { mBytes.append(static_cast<std::size_t>(depth) * 4, ' '); }
+
+    std::string mBytes;
+};
+
+} // namespace
+
+bool XmlFile::load(const std::string& path, TiXmlDocument& document)
+{
+    std::string bytes;
+    if (!AtomicFile::read(path, XmlFileGuard::MAX_BYTES, bytes) || !XmlFileGuard::accepts(bytes))
+        return false;
+    normaliseLineEnds(bytes);
+    document.Clear();
+    document.ClearError();
+    document.SetUserData(bytes.starts_with(BYTE_ORDER_MARK) ? &gMarked : nullptr);
+    document.SetValue(path);
+    document.SetTabSize(0); // nobody asks for the line and column of an element
+    document.Parse(bytes.c_str(), nullptr, TIXML_ENCODING_UNKNOWN);
+    return !document.Error();
+}
+
+bool XmlFile::save(const TiXmlDocument& document, const std::string& path)
+{
+    return AtomicFile::write(path, toBytes(document));
+}
+
+bool XmlFile::saveInPlace(const TiXmlDocument& document, const std::string& path)
+{
+    const std::string bytes = toBytes(document);
+    std::FILE* const file = std::fopen(path.c_str(), "we");
+    if (!file)
+        return false;
+    const bool isWritten = std::fwrite(bytes.data(), 1, bytes.size(), file) == bytes.size();
+    if (std::fclose(file) != 0 || !isWritten)
+        return false;
+    FileSyncQueue::enqueue(path);
+    return true;
+}
+
+std::string XmlFile::toBytes(const TiXmlDocument& document)
+{
+    Printer printer;
+    printer.print(document);
+    return printer.take();
+}

@@ -1,0 +1,26 @@
+// Loads and saves TinyXML documents.
+#pragma once
+
+#include <string>
+
+class TiXmlDocument;
+
+class XmlFile
+{
+public:
+    // Loads a file as TiXmlDocument::LoadFile with TIXML_ENCODING_UNKNOWN does, line ends included, and names
+    // the document after it. False for what is missing, no plain file, refused by XmlFileGuard, or not XML;
+    // the document is then not to be used. Any thread.
+    static bool load(const std::string& path, TiXmlDocument& document);
+
+    // Replaces the file by the bytes that TiXmlDocument::SaveFile writes, aside and renamed as AtomicFile
+    // does.
+    static bool save(const TiXmlDocument& document, const std::string& path);
+
+    // Writes to the file itself, for the one whose readers must rather find no file than an old one. Cut off,
+    // it leaves a part.
+    static bool saveInPlace(const TiXmlDocument& document, const std::string& path);
+
+    // The bytes that SaveFile writes.
+    static std::string toBytes(const TiXmlDocument& document);
+};
