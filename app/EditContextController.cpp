@@ -1,0 +1,131 @@
+#include "app/EditContextController.h"
+
+#include "document/ArchiveController.h"
+#include "document/ArchiveOrder.h"
+#include "messaging/ptc/CPack_Simplebuffer.h"
+#include "messaging/ptc/CSimpleBuffer.h"
+
+#include <QString>
+#include <algorithm>
+#include <cstdint>
+#include <limits>
+
+EditContextController* EditContextController::mInstance = nullptr;
+
+EditContextController* EditContextController::getInstance()
+{
+    if (!mInstance) {
+        mInstance = new EditContextController;
+        IEditContext::setInstance(mInstance);
+    }
+    return mInstance;
+}
+
+void EditContextController::clearInstance()
+{
+    IEditContext::setInstance(nullptr);
+    delete mInstance;
+    mInstance = nullptr;
+}
+
+EditContextController::EditContextController() : mArchiveController(std::make_unique<ArchiveController>())
+{
+    qRegisterMetaType<titler_paramter>("titler_paramter");
+}
+
+EditContextController::~EditContextController() = default;
+
+void EditContextController::showTitlerCreate(_CALL_TITLER_TYPE type)
+{
+    mCallType = type;
+    mIsCreate = true;
+    mFileList.clear();
+    emit signalShowTitlerParameter({_titler_paramter::CREATE_OR_EDIT, {}});
+}
+
+void EditContextController::showTitlerEdit(const _SHOW_TITLER_PARAMTER& param)
+{
+    mIsCreate = false;
+    mCallType = param.type;
+    if (!param.path.empty())
+        emit signalShowTitlerParameter({_titler_paramter::CREATE_OR_EDIT, param.path});
+}
+
+void EditContextController::resultCallBack(ITitlerCallBack* callBack)
+{
+    mCallBack.reset(callBack);
+}
+
+bool EditContextController::isCreateNew()
+{
+    return mCallBack && mIsCreate;
+}
+
+bool EditContextController::isMainNeedMsg()
+{
+    return mCallBack && !mIsCreate && !mFileList.isEmpty();
+}
+
+bool EditContextController::isNewCreateFile(std::wstring path)
+{
+    return mFileList.contains(path);
+}
+
+void EditContextController::insertFilePath(std::wstring path)
+{
+    if (!mFileList.contains(path))
+        mFileList.append(std::move(path));
+}
+
+void EditContextController::deleteFilePath(std::wstring path)
+{
+    mFileList.removeAll(path);
+}
+
+void EditContextController::setITitlerNoCallBack()
+{
+    mIsCreate = false;
+    mFileList.clear();
+}
+
+void EditContextController::sentITitlerCallBack(const std::wstring& folder)
+{
+    if (!isCreateNew())
+        return;
+    orderFilePathList(QString::fromStdWString(folder));
+    packSendData(folder, {mFileList.cbegin(), mFileList.cend()});
+    setITitlerNoCallBack();
+}
+
+// A file that the order does not know keeps the old order for all: the list is replaced whole or not at all.
+void EditContextController::orderFilePathList(const QString& folder)
+{
+    QList<std::wstring> ordered;
+    const std::vector<ArchiveOrder*> rows = mArchiveController->getFileOrder(folder);
+    for (const ArchiveOrder* row : rows) {
+        const std::wstring path = QString::fromLocal8Bit(row->getArchivePath()).toStdWString();
+        if (mFileList.contains(path))
+            ordered.append(path);
+    }
+    if (ordered.size() == mFileList.size())
+        mFileList = ordered;
+}
+
+void EditContextController::packSendData(const std::wstring& folder, const std::vector<std::wstring>& paths)
+{
+    simplebuffer buffer;
+    CSimpleBuffer::simplebuffer_init(&buffer, nullptr, 0);
+    const auto count = static_cast<std::uint16_t>(
+        std::min<std::size_t>(paths.size(), std::numeric_limits<std::uint16_t>::max()));
+    for (std::uint16_t i = 0; i < count; ++i)
+        CPack_Simplebuffer::pack_simplebuffer_wstring(&buffer, paths[i]);
+
+    _CALLBACK_TITLER_PARAMTER record;
+    record.type = mCallType;
+    record.path = folder;
+    record.data = buffer.data;
+    record.size = static_cast<int>(buffer.size);
+    record.count = static_cast<int>(paths.size());
+    mCallBack->finishTitlerCreateCallback(record);
+    CSimpleBuffer::simplebuffer_destroy(&buffer);
+}

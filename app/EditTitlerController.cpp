@@ -1,0 +1,142 @@
+#include "app/EditTitlerController.h"
+
+#include "app/TitlerToolFactory.h"
+
+#include <QThread>
+#include <cstdint>
+#include <mutex>
+
+namespace
+{
+constexpr long SERVICE_ID = 36;
+}
+
+namespace
+{
+std::mutex instanceMutex;
+}
+
+EditTitlerController* EditTitlerController::mpInstance = nullptr;
+
+EditTitlerController* EditTitlerController::getInstance()
+{
+    const std::lock_guard lock(instanceMutex);
+    if (!mpInstance) {
+        mpInstance = new EditTitlerController;
+        ITitleChangeReporter::setInstance(mpInstance);
+        ITitlerFolderReporter::setInstance(mpInstance);
+    }
+    return mpInstance;
+}
+
+void EditTitlerController::clearInstance()
+{
+    ITitleChangeReporter::setInstance(nullptr);
+    ITitlerFolderReporter::setInstance(nullptr);
+    delete mpInstance;
+    mpInstance = nullptr;
+}
+
+EditTitlerController::~EditTitlerController()
+{
+    if (mProxy && mConnected) {
+        mProxy->unregisterCallBack(mClientId);
+        mProxy->unregisterNotify(mClientId);
+    }
+}
+
+void EditTitlerController::setFactory(TitlerToolFactory* factory)
+{
+    if (mConnected)
+        return;
+    mProxy = factory->createService<IFileManagerController>(SERVICE_ID);
+    if (mProxy)
+        mProxy->registerCallBack(this);
+}
+
+void EditTitlerController::getClientID(int id)
+{
+    mClientId = id;
+    if (mProxy)
+        mProxy->registerNotify({this, id});
+    mConnected = true;
+}
+
+void EditTitlerController::editFolderStartStatus(QString folder)
+{
+    if (mProxy)
+        mProxy->titlerEditStatus({mClientId, folder.toStdWString()});
+}
+
+void EditTitlerController::editFolderEndStatus(QString folder)
+{
+    if (mProxy)
+        mProxy->titlerEditEndStatus({mClientId, folder.toStdWString()});
+}
+
+void EditTitlerController::renameFolderStartStatus(QString folder)
+{
+    if (mProxy)
+        mProxy->renameFolderStart({mClientId, folder.toStdWString()});
+}
+
+// The picture thread reports through here too; a sender must not be shared between threads.
+void EditTitlerController::changeTitlerStatus(FileManagerDefine::emTITLECHANGE_TYPE type, QString path)
+{
+    if (QThread::currentThread() != thread()) {
+        QMetaObject::invokeMethod(
+            this, [this, type, path] { changeTitlerStatus(type, path); }, Qt::QueuedConnection);
+        return;
+    }
+    if (mProxy)
+        mProxy->updateTitlerStatus({mClientId, path.toStdWString(), type});
+}
+
+void EditTitlerController::changeTitlerFolderName(QString oldPath, QString newPath)
+{
+    if (mProxy)
+        mProxy->updateTitlerFolderName({mClientId, oldPath.toStdWString(), newPath.toStdWString()});
+}
+
+void EditTitlerController::updateTitlerOrder(QString folder)
+{
+    if (mProxy)
+        mProxy->updateTitlerOrder({mClientId, folder.toStdWString()});
+}
+
+void EditTitlerController::importNotify(FileManagerDefine::tagImportNotify notify)
+{
+    const std::uint64_t fileType = static_cast<std::uint32_t>(notify.fileType) |
+                                   static_cast<std::uint64_t>(static_cast<std::uint32_t>(notify.fileTypeHigh))
+                                       << 32;
+    if (fileType == FileManagerDefine::FILE_TYPE_FONT)
+        emit importNewFontFamilies(QString::fromStdWString(notify.path));
+    else if (fileType == FileManagerDefine::FILE_TYPE_TITLER_TEMPLATE)
+        emit importNewUserTemplate(QString::fromStdWString(notify.path));
+}
+
+void EditTitlerController::deleteNotify(FileManagerDefine::tagDeleteNotify notify)
+{
+    if (notify.result == 0 && notify.fileType == FileManagerDefine::FILE_TYPE_TITLER_TEMPLATE)
+        emit deleteUserTemplate(QString::fromStdWString(notify.path));
+}
+
+void EditTitlerController::renameTitlerTemplateNotify(FileManagerDefine::tagRenameNotify notify)
+{
+    if (notify.fileType != FileManagerDefine::FILE_TYPE_TITLER_TEMPLATE)
+        return;
+    emit renameUserTemplate(QString::fromStdWString(notify.strings[0]),
+                            QString::fromStdWString(notify.strings[2]),
+                            QString::fromStdWString(notify.strings[3]));
+}
+
+void EditTitlerController::updateTitlerFolderInFileManagerDelete(std::wstring folder)
+{
+    emit folderDeleteFromFileManager(std::move(folder));
+}
+
+void EditTitlerController::updateFolderNameInCurrentProjectNotify(
+    FileManagerDefine::tagChangeFolderNameParam param)
+{
+    emit folderNameChangeFromFileManager(std::move(param));
+}

@@ -1,0 +1,67 @@
+// The link to the file manager service: reports what this program changes in the title folders, and hands on
+// notices of what was changed elsewhere (fonts and templates imported, templates deleted or renamed, folders
+// renamed or deleted).
+//
+// changeTitlerStatus may be called from any thread; the rest belongs to the GUI thread.
+#pragma once
+
+#include <QObject>
+#include <QString>
+#include <string>
+
+#include "document/ITitleChangeReporter.h"
+#include "library/ITitlerFolderReporter.h"
+#include "messaging/services/FileManagerDefine.h"
+#include "messaging/services/IFileManagerController.h"
+#include "messaging/services/IFileManagerControllerCallBack.h"
+#include "messaging/services/IFileManagerControllerNotify.h"
+
+class TitlerToolFactory;
+
+class EditTitlerController : public QObject,
+                             public IFileManagerControllerCallBack,
+                             public IFileManagerControllerNotify,
+                             public ITitleChangeReporter,
+                             public ITitlerFolderReporter
+{
+    Q_OBJECT
+
+public:
+    static EditTitlerController* getInstance();
+    static void clearInstance();
+
+    void setFactory(TitlerToolFactory* factory);
+
+    // Folder paths are full paths.
+    void editFolderStartStatus(QString folder) override;
+    void editFolderEndStatus(QString folder) override;
+    void renameFolderStartStatus(QString folder);
+    void changeTitlerStatus(FileManagerDefine::emTITLECHANGE_TYPE type, QString path) override;
+    void changeTitlerFolderName(QString oldPath, QString newPath);
+    void updateTitlerOrder(QString folder) override;
+
+    void getClientID(int id) override;
+    void importNotify(FileManagerDefine::tagImportNotify notify) override;
+    void deleteNotify(FileManagerDefine::tagDeleteNotify notify) override;
+    void renameTitlerTemplateNotify(FileManagerDefine::tagRenameNotify notify) override;
+    void updateTitlerFolderInFileManagerDelete(std::wstring folder) override;
+    void updateFolderNameInCurrentProjectNotify(FileManagerDefine::tagChangeFolderNameParam param) override;
+
+signals:
+    void importNewFontFamilies(QString path);
+    void importNewUserTemplate(QString path);
+    void deleteUserTemplate(QString path);
+    void renameUserTemplate(QString first, QString third, QString fourth);
+    void folderDeleteFromFileManager(std::wstring folder);
+    void folderNameChangeFromFileManager(FileManagerDefine::tagChangeFolderNameParam param);
+
+private:
+    EditTitlerController() = default;
+    ~EditTitlerController() override;
+
+    static EditTitlerController* mpInstance;
+
+    IFileManagerController* mProxy = nullptr;
+    int mClientId = -1;
+    bool mConnected = false;
+};

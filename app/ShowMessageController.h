@@ -1,0 +1,76 @@
+// The link to the message service, which shows the numbered message boxes on top of everything, and the
+// source of the mask requests that come back from it. Implements what other folders see as
+// MessageBoxController.
+//
+// GUI thread; only the creation of the instance is guarded.
+#pragma once
+
+#include <QMap>
+#include <QPointer>
+#include <QString>
+#include <QWidget>
+
+#include "canvas/MessageBoxController.h"
+#include "messaging/services/IMessageCenter.h"
+#include "messaging/services/IMessageCenterCallBack.h"
+#include "messaging/services/IMessageCenterNotify.h"
+#include "messaging/services/MessageDefine.h"
+
+class ShowMessageController : public MessageBoxController,
+                              public IMessageCenterCallBack,
+                              public IMessageCenterNotify
+{
+    Q_OBJECT
+
+public:
+    static ShowMessageController* getInstance();
+    static void clearInstance();
+
+    void setFactory(TitlerToolFactory* factory) override;
+
+    // Without a link to the service a message is lost silently.
+    void postMessage(MessageDef::Message_ID id) override;
+    void postMessage(MessageDef::Message_ID id, QString text) override;
+    void postMessage(MessageDef::Message_ID id, MessageDefine::_emBoxType boxType, QString text) override;
+
+    // The window that mask requests need; null is ignored.
+    void setMessageMainWindow(QWidget* window) override;
+    bool GetTitlerIsTop() override;
+    QMap<QString, QString> getMapData() override;
+    void closeMessage(MessageDefine::_emCloseType type) override;
+
+    void changeTopWindow(MessageDefine::_emTopWindow top);
+
+    void showDialogOpacityWidget();
+    void hideDialogOpacityWidget();
+    void showMessageOpacityWidget();
+    void hideMessageOpacityWidget();
+
+    // Answers and notices of the service.
+    void setClientID(int id) override;
+    void getTopWindowCallBack(int) override {}
+    void getTopWindowNotify(int top) override;
+    void postMessageNotify(MessageDefine::_tagMessageParam param) override;
+    void closeMessageNotify(MessageDefine::_tagCloseParam param) override;
+    void showBarNotify(int) override {}
+
+signals:
+    void signalsShowDialogMaskWidget(bool show);
+    void signalsShowMessageMaskWidget(bool show);
+
+private:
+    ShowMessageController();
+    ~ShowMessageController() override;
+
+    bool mainWindowIsShown() const;
+
+    static ShowMessageController* mInstance;
+
+    int mClientId = -1;
+    int mLastMessageId = -1;
+    IMessageCenter* mProxy = nullptr;
+    QMap<QString, QString> mMapData;
+    QPointer<QWidget> mMainWindow;
+    bool mTitlerIsTop = false;
+    bool mConnected = false;
+};

@@ -1,0 +1,51 @@
+#include "app/ShowTitlerController.h"
+
+#include "app/TitlerToolFactory.h"
+
+#include <QDebug>
+#include <QString>
+
+namespace
+{
+constexpr long SERVICE_ID = 92;
+}
+
+ShowTitlerController* ShowTitlerController::mInstance = nullptr;
+
+ShowTitlerController* ShowTitlerController::getInstance()
+{
+    if (!mInstance)
+        mInstance = new ShowTitlerController;
+    return mInstance;
+}
+
+void ShowTitlerController::clearInstance()
+{
+    delete mInstance;
+    mInstance = nullptr;
+}
+
+ShowTitlerController::ShowTitlerController()
+{
+    qRegisterMetaType<titler_paramter>("titler_paramter");
+}
+
+void ShowTitlerController::setFactory(TitlerToolFactory* factory)
+{
+    mProxy = factory->createService<IShowTitlerController>(SERVICE_ID);
+    if (mProxy)
+        mProxy->registerCallBack(this);
+}
+
+void ShowTitlerController::changeFolderStatus(SubCommonDefine::tagFOLDER_TYPE folder)
+{
+    qDebug() << "ShowTitlerController_changeFolderStatus() [setFolderStatus()] Path:" +
+                    QString::fromStdWString(folder.path);
+    if (mProxy)
+        mProxy->setFolderStatus(std::move(folder));
+}
+
+void ShowTitlerController::showTitler()
+{
+    emit signalShowTitlerParameter({_titler_paramter::SUB_PANEL, {}});
+}

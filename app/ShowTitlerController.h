@@ -1,0 +1,37 @@
+// The second way in: the sub panel asks for the window, without wanting a result. GUI thread.
+#pragma once
+
+#include <QObject>
+
+#include "app/TitlerParamter.h"
+#include "messaging/services/IShowTitlerController.h"
+#include "messaging/services/IShowTitlerControllerCallBack.h"
+#include "messaging/services/SubCommonDefine.h"
+
+class TitlerToolFactory;
+
+class ShowTitlerController : public QObject, public IShowTitlerControllerCallBack
+{
+    Q_OBJECT
+
+public:
+    static ShowTitlerController* getInstance();
+    static void clearInstance();
+
+    // Blocks until the sub panel process listens.
+    void setFactory(TitlerToolFactory* factory);
+
+    void changeFolderStatus(SubCommonDefine::tagFOLDER_TYPE folder);
+
+    void showTitler() override;
+
+signals:
+    void signalShowTitlerParameter(titler_paramter paramter);
+
+private:
+    ShowTitlerController();
+
+    static ShowTitlerController* mInstance;
+
+    IShowTitlerController* mProxy = nullptr;
+};

@@ -1,0 +1,40 @@
+// The link to the power service. GUI thread.
+#pragma once
+
+#include <QObject>
+
+#include "messaging/services/IPowerManager.h"
+#include "messaging/services/IPowerManagerCallBack.h"
+#include "messaging/services/IPowerManagerNotify.h"
+
+class TitlerToolFactory;
+
+class TitlerPowerController : public QObject, public IPowerManagerCallBack, public IPowerManagerNotify
+{
+    Q_OBJECT
+
+public:
+    static TitlerPowerController* getInstance();
+    // Takes 5 seconds when connected: the time that the service needs to drop this client.
+    static void clearInstance();
+
+    void setFactory(TitlerToolFactory* factory);
+
+    void getClientID(int id) override;
+    void powerOff() override;
+    void powerOn() override;
+
+signals:
+    void signalPowerOn();
+    void signalPowerOff();
+
+private:
+    TitlerPowerController() = default;
+    ~TitlerPowerController() override;
+
+    static TitlerPowerController* mInstance;
+
+    IPowerManager* mProxy = nullptr;
+    int mClientId = -1;
+    bool mConnected = false;
+};

@@ -1,0 +1,65 @@
+// Builds everything that talks to the siblings: the listener on port 1003 with the adapter of the service
+// that this program offers, the proxies of the services that it calls, and the callback adapters those need.
+// Owns the receiver, the senders and the service object; proxies and adapters live as long as the factory.
+//
+// GUI thread.
+#pragma once
+
+#include <memory>
+#include <unordered_map>
+#include <vector>
+
+#include "messaging/ptc/InstanceFactory.h"
+#include "messaging/services/ITitler.h"
+
+namespace PTC
+{
+class IObject;
+class ISender;
+class Proxy;
+class QtReceiver;
+} // namespace PTC
+
+class TitlerToolFactory : public PTC::InstanceFactory
+{
+public:
+    static constexpr long TITLER_INTERFACE_ID = 117;
+    static constexpr long TITLER_CALLBACK_INTERFACE_ID = 118;
+    static constexpr long TITLER_CLIENT_NUMBER = 1003; // identity and listening port of this process
+    static constexpr long TITLER_RECEIVER_ID = 4;
+
+    TitlerToolFactory();
+    ~TitlerToolFactory() override;
+
+    // Starts the listener. False when the port cannot be bound; the factory still makes proxies then, but no
+    // request reaches this process.
+    bool initialize() override;
+
+    // Writes the proxy of a service to *out; an unknown id leaves it untouched. Blocks, without limit, until
+    // the sibling accepts the connection.
+    void createInstance(long id, void** out) override;
+
+    // Takes over an implementation of ITitler in place of the own one; only for its id, and only the first.
+    virtual void RegisterObject(long id, void* object);
+
+    PTC::IAdapterBase* createAdapter(long type, PTC::IReceiver* receiver, void* target) override;
+    PTC::IProxyBase* createProxy(long type, long id, long client) override;
+
+    // createInstance with the interface's type: createInstance hands out the interface pointer as void*.
+    template <typename Interface>
+    Interface* createService(long id)
+    {
+        void* instance = nullptr;
+        createInstance(id, &instance);
+        return static_cast<Interface*>(instance);
+    }
+
+private:
+    PTC::ISender* serviceSender(long client, long port);
+
+    std::unique_ptr<ITitler> mTitler;
+    PTC::QtReceiver* mReceiver = nullptr;              // owned by the remote receiver, which listens
+    std::unique_ptr<PTC::QtReceiver> mUnboundReceiver; // owns it instead when nothing listens
+    std::vector<std::unique_ptr<PTC::IObject>> mProxies;
+    long mNextAdapterId = 0;
+};

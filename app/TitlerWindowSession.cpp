@@ -1,0 +1,271 @@
+// Requests, closing and undo of the window.
+#include "app/TitlerWindow.h"
+
+#include "app/EditContextController.h"
+#include "app/EditTitlerController.h"
+#include "app/ShowMessageController.h"
+#include "app/SystemSetupInfoController.h"
+#include "app/ToolsBar.h"
+#include "canvas/CanvasScene.h"
+#include "document/Archive.h"
+#include "library/ArchiveList.h"
+#include "touchui/KSInputContext.h"
+
+#include <QAction>
+#include <QApplication>
+#include <QCloseEvent>
+#include <QFileInfo>
+#include <QUndoCommand>
+#include <unistd.h>
+
+namespace
+{
+
+constexpr unsigned SAVE_POLL_SECONDS = 1;
+constexpr int FOCUS_COMMAND_ID = 1;
+constexpr int CANVAS_CHECKER = 2;
+
+} // namespace
+
+void TitlerWindow::showTitlerWindow(titler_paramter paramter)
+{
+    if (!isHidden())
+        return;
+    show();
+    activateWindow();
+    raise();
+    if (mShowMessageController) {
+        mShowMessageController->changeTopWindow(MessageDefine::TOP_WINDOW_TITLER);
+        mShowMessageController->setMessageMainWindow(this);
+    }
+    mCanvasScene->setModuleInfo(m_emModuleInfo);
+
+    m_bEditByMain = paramter.mode == _titler_paramter::CREATE_OR_EDIT;
+    if (paramter.mode == _titler_paramter::CREATE_OR_EDIT) {
+        refreshArchiveList(QString::fromStdWString(paramter.path));
+    } else if (paramter.mode == _titler_paramter::SUB_PANEL) {
+        EditContextController::getInstance()->setITitlerNoCallBack();
+        showFolderDialog();
+    }
+
+    if (m_bHasMessage) {
+        m_bHasMessage = false;
+        if (mShowMessageController)
+            mShowMessageController->postMessage(MessageDef::MESSAGE_FONT_MISSING, m_strMessage);
+    }
+    if (mSystemSetupInfoController)
+        mSystemSetupInfoController->getInputLanguage();
+    changeFontComboxItem(m_emModuleInfo);
+}
+
+void TitlerWindow::refreshArchiveList(QString path)
+{
+    if (path.isEmpty()) {
+        showFolderDialog();
+        return;
+    }
+    const QFileInfo info(path);
+    if (info.isDir()) {
+        mArchiveList->refreshArchiveList(path);
+    } else if (info.exists()) {
+        const qsizetype slash = path.lastIndexOf(QLatin1Char('/'));
+        mArchiveList->refreshArchiveListInFile(path.left(slash), path.mid(slash + 1));
+    } else {
+        hide();
+    }
+}
+
+// The folder that was last open stands for the operator's choice.
+void TitlerWindow::showFolderDialog()
+{
+    mArchiveList->initArchiveList();
+}
+
+// An empty design stands for the operator's choice.
+void TitlerWindow::showTemplateDialog()
+{
+    Archive blank;
+    slotStartCreateNewArchiveFromTemplate(&blank);
+}
+
+void TitlerWindow::closeTitlerWindow()
+{
+    mArchiveList->stopArchiveListTapAndHoldTimer();
+    const QString path = mArchiveList->getCurrentPath();
+    saveCurrentTitle();
+    clearUndoStack();
+    mArchiveList->synchronizationFolderFile();
+    if (!path.isEmpty() && mEditTitlerController)
+        mEditTitlerController->editFolderEndStatus(path);
+    mToolsBar->resetToDefaultState();
+    resetCanvasBackground();
+    while (!dataSaveIsFinished())
+        ::sleep(SAVE_POLL_SECONDS);
+
+    if (m_bEditByMain && EditContextController::getInstance()->isMainNeedMsg()) {
+        if (mShowMessageController)
+            mShowMessageController->postMessage(MessageDef::MESSAGE_CONFIRM_CLOSE);
+        EditContextController::getInstance()->setITitlerNoCallBack();
+        return;
+    }
+    closeTitlerMainWindow();
+}
+
+void TitlerWindow::resetCanvasBackground()
+{
+    QAction checker(nullptr);
+    checker.setData(CANVAS_CHECKER);
+    mCanvasScene->slotShowCanvasBG(&checker);
+}
+
+void TitlerWindow::closeTitlerMainWindow()
+{
+    const QString path = mArchiveList->getCurrentPath();
+    if (m_bRealClose) {
+        close();
+    } else {
+        hide();
+        mCanvasScene->clearCanvas();
+        mArchiveList->cleanArchiveList();
+        mArchiveList->clearCopyArchive();
+    }
+    m_bFolderDialogFromWindow = false;
+    if (mInputContext)
+        mInputContext->simpleCloseSoftKeyBoardWindow();
+    EditContextController::getInstance()->sentITitlerCallBack(path.toStdWString());
+    EditContextController::getInstance()->setITitlerNoCallBack();
+    if (mShowMessageController)
+        mShowMessageController->changeTopWindow(MessageDefine::TOP_WINDOW_MAIN);
+}
+
+void TitlerWindow::continueCloseTitler(MessageDefine::tagCloseParam param)
+{
+    if (!isHidden() && param.messageId == MessageDef::MESSAGE_CONFIRM_CLOSE)
+        closeTitlerMainWindow();
+}
+
+void TitlerWindow::setRealClose(bool realClose)
+{
+    m_bRealClose = realClose;
+}
+
+bool TitlerWindow::dataSaveIsFinished()
+{
+    return mCanvasScene->isEditFinish();
+}
+
+void TitlerWindow::saveCurrentTitle()
+{
+    mCanvasScene->clearItemsSelectionAndFocus();
+    mCanvasScene->slotMakeSceneThumnail();
+}
+
+void TitlerWindow::slotPowerOff()
+{
+    endProcess();
+}
+
+void TitlerWindow::endProcess()
+{
+    if (m_bEnding)
+        return;
+    m_bEnding = true;
+    saveCurrentTitle();
+    while (!dataSaveIsFinished())
+        ::sleep(SAVE_POLL_SECONDS);
+    close();
+    QApplication::closeAllWindows();
+    QCoreApplication::quit();
+}
+
+// A window manager's close is the operator's Close: the process lives on.
+void TitlerWindow::closeEvent(QCloseEvent* event)
+{
+    if (m_bRealClose || m_bEnding) {
+        QMainWindow::closeEvent(event);
+        QCoreApplication::quit();
+        return;
+    }
+    event->ignore();
+    closeTitlerWindow();
+}
+
+// A change of the selected title at a clean stack leaves the stack clean.
+void TitlerWindow::pushUndoStack(QUndoCommand* subUndoCommand)
+{
+    if (mUndoStack.isClean() && subUndoCommand->id() == FOCUS_COMMAND_ID) {
+        delete subUndoCommand;
+        return;
+    }
+    mUndoStack.push(subUndoCommand);
+}
+
+void TitlerWindow::clearUndoStack()
+{
+    mUndoStack.clear();
+    if (ArchiveItem* item = mArchiveList->getCurrentOperationArchive())
+        mArchiveList->clearOperationItemState(item);
+}
+
+void TitlerWindow::slotStartCreateNewArchiveFromTemplate(Archive* archiveData)
+{
+    mArchiveList->createArchiveFromTemplate(archiveData);
+    mCanvasScene->createThumnailPicture();
+}
+
+void TitlerWindow::slotStartPasteArchive()
+{
+    mCanvasScene->createThumnailPicture();
+}
+
+void TitlerWindow::slotNewTextButtonClicked()
+{
+    mCanvasScene->slotInsertNewTextItem();
+}
+
+void TitlerWindow::pressDelectButton()
+{
+    mCanvasScene->deleteSelectedItems();
+    if (mInputContext)
+        mInputContext->dummyCloseSoftKeyBoardWindow();
+}
+
+// The checker shows the window's own picture behind the canvas.
+void TitlerWindow::slotCanvasButtonClicked(QAction*)
+{
+    update();
+}
+
+void TitlerWindow::setHasMessageToShowInformation(bool isNeedShow, QString defaultFont)
+{
+    m_bHasMessage = isNeedShow;
+    m_strMessage = std::move(defaultFont);
+}
+
+void TitlerWindow::hideSoftWareWithDeleteEmptyItems()
+{
+    leaveTextEditing(true);
+}
+
+void TitlerWindow::hideSoftWareWithOutDeleteEmptyItems()
+{
+    leaveTextEditing(false);
+}
+
+void TitlerWindow::leaveTextEditing(bool deleteEmptyItems)
+{
+    const bool isEditing = mCanvasScene->itemIsEditorInteraction();
+    if (isEditing || mCanvasScene->itemIsSelectionMode()) {
+        if (isEditing)
+            mCanvasScene->clearItemsSelectionAndFocus();
+        else
+            mCanvasScene->clearItemsSelectionMode();
+        if (deleteEmptyItems)
+            slotDeleteEmptyItems();
+        mCanvasScene->disableTextPropertyArea();
+        if (isEditing && deleteEmptyItems)
+            qDebug("hideSoftWareWithDeleteEmptyItems");
+    }
+    if (mInputContext)
+        mInputContext->dummyCloseSoftKeyBoardWindow();
+}

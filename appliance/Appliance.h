@@ -1,0 +1,109 @@
+// The processes that surround a titler, in one: the main process and the sub panel process with the services
+// that a titler calls, their state, and the caller of the titler. Everything lives in one thread.
+#pragma once
+
+#include "appliance/Sibling.h"
+#include "messaging/ptc/IProxyBase.h"
+#include "messaging/services/ITitler.h"
+#include "messaging/services/ITitlerCallBack.h"
+
+#include <QJsonArray>
+#include <QString>
+
+#include <deque>
+#include <functional>
+#include <map>
+#include <memory>
+#include <optional>
+
+class Appliance : private ITitlerCallBack
+{
+public:
+    using EventSink = std::function<void(const QJsonObject& event)>;
+
+    // Every call of a titler goes to the sink as {"event":"call","service":..,"method":..,"args":{..}}, every
+    // result as
+    // {"event":"callback",..}.
+    explicit Appliance(EventSink sink);
+    ~Appliance() override;
+
+    // Listens as both processes. False when a port cannot be bound.
+    bool start();
+    // Whether both processes are connected to the titler; tries once.
+    bool connectToTitler();
+    // Null while the titler does not listen.
+    ITitler* titler();
+    // Registers for the results of create sessions. False while the titler does not listen.
+    bool registerAtTitler();
+
+    // The client's side of a service, by its interface. Null until a client has registered it.
+    template <typename Interface>
+    Interface* callBackOf(const QString& service)
+    {
+        return dynamic_cast<Interface*>(m_clients[service].callBack.get());
+    }
+    template <typename Interface>
+    Interface* notifyOf(const QString& service)
+    {
+        return dynamic_cast<Interface*>(m_clients[service].notify.get());
+    }
+    // The id that the service gave its client, -1 before.
+    int clientIdOf(const QString& service);
+
+    // The oldest call that came in and was not taken yet; at most KEPT_CALLS are kept.
+    std::optional<QJsonObject> takeCall(const QString& service, const QString& method);
+    int countCalls(const QString& service, const QString& method) const;
+    // The oldest result that was not taken yet.
+    std::optional<QJsonObject> takeResult();
+    void forgetCallsAndResults();
+
+    // State that the services answer with.
+    struct State {
+        int systemLanguage = 1;
+        int inputLanguage = 1;
+        int module = 0;
+        int topWindow = 0;
+    };
+    State state;
+
+    struct Options {
+        bool keyEcho = true;      // the soft keyboard sends keys back that it is sent
+        bool stateOnClose = true; // it tells its state when it is closed
+        bool eventEcho = true;    // touch lock announcements go to all clients, their sender too
+    };
+    Options options;
+
+private:
+    static constexpr std::size_t KEPT_CALLS = 10000;
+
+    struct Client {
+        std::unique_ptr<PTC::IProxyBase> callBack;
+        std::unique_ptr<PTC::IProxyBase> notify;
+        int clientId = -1;
+    };
+    struct KeptCall {
+        QJsonObject event;
+        bool taken = false;
+    };
+
+    void finishTitlerCreateCallback(_CALLBACK_TITLER_PARAMTER param) override;
+    void handleCall(const ServiceDescription& service, const ServiceMethod& method, const QJsonObject& args,
+                    std::unique_ptr<PTC::IProxyBase> proxy);
+    void keep(const QJsonObject& event);
+    void giveClientId(const QString& service);
+    void unregister(const QString& service, const QString& method, int clientId);
+    void answer(const QString& service, const QString& method, const QJsonObject& args);
+    void answerMessageCenter(const QString& method, const QJsonObject& args);
+    void answerEventFilter(const QString& method, const QJsonObject& args);
+    void answerKeyboard(const QString& method, const QJsonObject& args);
+    void answerSystemSetup(const QString& method);
+
+    EventSink m_sink;
+    std::map<QString, Client> m_clients;
+    std::deque<KeptCall> m_calls;
+    std::deque<QJsonObject> m_results;
+    int m_lastClientId = 0;
+    std::unique_ptr<Sibling> m_main;
+    std::unique_ptr<Sibling> m_subPanel;
+    std::unique_ptr<ITitler> m_titler;
+};

@@ -1,0 +1,33 @@
+// titler_provision: fills the data path of the environment with what a titler needs and some sample titles.
+// Prints the base path that it filled. Ends 1 when something could not be written.
+
+#include "appliance/TitlerProvision.h"
+
+#include <QApplication>
+#include <QFontInfo>
+#include <QTextStream>
+
+int main(int argc, char* argv[])
+{
+    // Pictures are the same without a display, and there need not be one.
+    qputenv("QT_QPA_PLATFORM", "offscreen");
+    const QApplication application(argc, argv);
+    QTextStream out(stdout);
+    QTextStream err(stderr);
+
+    const QString base = TitlerProvision::basePathOfEnvironment();
+    if (base.isEmpty()) {
+        err << "titler_provision: no data path\n";
+        return 1;
+    }
+    if (QFontInfo(QFont(QStringLiteral("KST"))).family() != QStringLiteral("KST")) {
+        err << "titler_provision: the fonts of the build are not in use (FONTCONFIG_FILE)\n";
+    }
+    TitlerProvision provision(base);
+    if (!provision.writeMissing()) {
+        err << "titler_provision: " << provision.error() << "\n";
+        return 1;
+    }
+    out << base << "\n";
+    return 0;
+}

@@ -1,0 +1,194 @@
+#include "canvas/CaretPainter.h"
+
+#include "canvas/CharacterFormat.h"
+#include "canvas/GraphicsText.h"
+#include "canvas/StyleDocument.h"
+#include "canvas/TextPainter.h"
+
+#include <QFontMetricsF>
+#include <QPainter>
+#include <QPixmap>
+#include <QTextBlock>
+#include <QTextCursor>
+#include <QTextDocument>
+#include <QTextLayout>
+#include <algorithm>
+
+namespace
+{
+
+const QColor CaretColor(0, 232, 0);
+const QColor DraggedSelection(Qt::darkBlue);
+constexpr double CaretWidth = 2.0;
+constexpr double HandleLineWidth = 3.0;
+constexpr double BaselineShare = 0.85;
+constexpr double CaretOverhang = 3.0;
+
+const QPixmap& unpressedPicture()
+{
+    static const QPixmap picture(TextObjectConstants::UN_PRESSED_CARET_PIXMAP_PATH);
+    return picture;
+}
+
+const QPixmap& pressedPicture()
+{
+    static const QPixmap picture(TextObjectConstants::PRESSED_CARET_PIXMAP_PATH);
+    return picture;
+}
+
+} // namespace
+
+CaretPainter::CaretPainter(GraphicsText& item, TouchState& state) : m_item(item), m_state(state)
+{
+}
+
+bool CaretPainter::noHandleCursor() const
+{
+    if (m_state.handleMoving)
+        return false;
+    if (!m_state.handleCaret)
+        return true;
+    return !m_item.textCursor().hasSelection() && m_state.previous.position < 0;
+}
+
+void CaretPainter::refreshHandles()
+{
+    if (!m_state.handleCaret)
+        return;
+    const QTextCursor cursor = m_item.textCursor();
+    if (cursor.hasSelection()) {
+        m_state.previous.position = cursor.anchor();
+        m_state.current.position = cursor.position();
+    }
+    CaretGeometry& carets = m_item.textPainter().carets();
+    TouchState::End& current = m_state.current;
+    carets.caretPoint(current.line, current.point, current.block, cursor.position());
+    if (!cursor.hasSelection()) {
+        const int position = m_state.previous.position;
+        m_state.previous = current;
+        m_state.previous.position = position;
+        return;
+    }
+    TouchState::End& previous = m_state.previous;
+    carets.caretPoint(previous.line, previous.point, previous.block, previous.position);
+}
+
+void CaretPainter::adjustCurPosToPaintSelectionWhenContinueSelect()
+{
+    QTextCursor cursor = m_item.textCursor();
+    if (!m_state.handleMoving || cursor.hasSelection())
+        return;
+    if (cursor.position() == m_state.previous.position || cursor.position() == m_state.current.position)
+        return;
+    if (m_state.current.position < 0 || m_state.current.position >= m_item.document()->characterCount())
+        return;
+    cursor.setPosition(m_state.current.position);
+    m_item.setTextCursor(cursor);
+}
+
+void CaretPainter::paintSelectionWhenContinueSelect(QPainter* painter) const
+{
+    if (!m_state.handleMoving || m_item.textCursor().hasSelection() || m_state.previous.position < 0)
+        return;
+    if (m_state.previous.block != m_state.current.block) {
+        paintShadowBlockFromPreviousCaretToCurrentCaret(painter);
+        return;
+    }
+    const QPointF bottom = m_state.current.point + QPointF(HANDLEPIXMAPWIDTH / 2.0, 0.0);
+    painter->fillRect(QRectF(m_state.previous.line.p1(), bottom).normalized(), DraggedSelection);
+}
+
+void CaretPainter::paintShadowBlockFromPreviousCaretToCurrentCaret(QPainter* painter) const
+{
+    const bool forward = m_state.previous.block < m_state.current.block;
+    const TouchState::End& first = forward ? m_state.previous : m_state.current;
+    const TouchState::End& last = forward ? m_state.current : m_state.previous;
+    CaretGeometry& carets = m_item.textPainter().carets();
+    for (int number = first.block; number <= last.block; ++number) {
+        const QTextBlock block = m_item.document()->findBlockByNumber(number);
+        if (!block.isValid())
+            continue;
+        TouchState::End begin;
+        TouchState::End end;
+        carets.caretPoint(begin.line, begin.point, begin.block, block.position());
+        carets.caretPoint(end.line, end.point, end.block, block.position() + block.length() - 1);
+        const double left = number == first.block ? first.line.x1() : begin.line.x1();
+        const double right = number == last.block ? last.line.x1() : end.line.x1();
+        painter->fillRect(QRectF(QPointF(left, begin.line.y1()), QPointF(right, end.line.y2())).normalized(),
+                          DraggedSelection);
+    }
+}
+
+void CaretPainter::paintCaretAndHandles(QPainter* painter)
+{
+    adjustCurPosToPaintSelectionWhenContinueSelect();
+    painter->setBrush(Qt::NoBrush);
+    if (m_state.handleMoving) {
+        paintCursor(painter);
+        paintMovingHandles(painter);
+    } else if (m_state.handleCaret) {
+        showCursorForSelecting(painter);
+    } else {
+        paintCursor(painter);
+    }
+}
+
+void CaretPainter::paintCursor(QPainter* painter) const
+{
+    const int position = m_item.textCursor().position();
+    const StyleDocument& styles = m_item.styles();
+    if (position < 0 || position > styles.count())
+        return;
+    TouchState::End caret;
+    if (!m_item.textPainter().carets().caretPoint(caret.line, caret.point, caret.block, position))
+        return;
+    const TextStyle* style = styles.at(std::max(position - 1, 0));
+    const QFont font = style ? CharacterFormat::font(*style, m_item.canvasRatio()) : m_item.font();
+    const double length = caret.line.length();
+    const double top = caret.line.y1();
+    const double ascentTop = top + BaselineShare * length - QFontMetricsF(font).height() - CaretOverhang;
+    painter->setPen(QPen(CaretColor, CaretWidth));
+    painter->drawLine(
+        QLineF(caret.line.x1(), std::max(top, ascentTop), caret.line.x1(), top + length + CaretOverhang));
+}
+
+void CaretPainter::drawHandle(QPainter* painter, const TouchState::End& end, const QPixmap& picture)
+{
+    painter->drawPixmap(QRectF(end.point, QSizeF(HANDLEPIXMAPWIDTH, HANDLEPIXMAPHEIGHT)), picture,
+                        QRectF(picture.rect()));
+}
+
+void CaretPainter::paintMovingHandles(QPainter* painter) const
+{
+    painter->setPen(QPen(CaretColor, HandleLineWidth));
+    painter->drawLine(m_state.previous.line);
+    painter->drawLine(m_state.current.line);
+    drawHandle(painter, m_state.previous, unpressedPicture());
+    drawHandle(painter, m_state.current, pressedPicture());
+}
+
+void CaretPainter::showCursorForSelecting(QPainter* painter)
+{
+    refreshHandles();
+    painter->setPen(QPen(CaretColor, HandleLineWidth));
+    drawCurPosPixmap(painter);
+    if (!m_item.textCursor().hasSelection())
+        return;
+    painter->drawLine(m_state.previous.line);
+    drawHandle(painter, m_state.previous, unpressedPicture());
+}
+
+void CaretPainter::drawCurPosPixmap(QPainter* painter) const
+{
+    if (m_state.previous.position < 0)
+        return;
+    if (m_state.released) {
+        painter->drawLine(m_state.current.line);
+        drawHandle(painter, m_state.current, unpressedPicture());
+    } else if (m_state.moved || m_state.longPressed) {
+        painter->drawLine(m_state.current.line);
+        drawHandle(painter, m_state.current, pressedPicture());
+    } else if (m_state.pressed && m_item.textCursor().position() == m_state.current.position) {
+        drawHandle(painter, m_state.current, pressedPicture());
+    }
+}

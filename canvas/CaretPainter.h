@@ -1,0 +1,38 @@
+#pragma once
+
+#include "canvas/TextObjectConstants.h"
+#include "canvas/TouchState.h"
+
+class GraphicsText;
+class QPainter;
+class QPixmap;
+class QTextBlock;
+
+// Paints caret and selection handles of a text object that is edited. GUI thread only.
+class CaretPainter : public TextObjectConstants
+{
+public:
+    CaretPainter(GraphicsText& item, TouchState& state);
+
+    // Below the glyphs: the selection while a handle is dragged.
+    void paintSelectionWhenContinueSelect(QPainter* painter) const;
+    // Above the glyphs: caret, or the handles.
+    void paintCaretAndHandles(QPainter* painter);
+
+    // Brings both ends to where the cursor stands now.
+    void refreshHandles();
+    // No handle is shown: the selection cannot be dragged.
+    bool noHandleCursor() const;
+
+private:
+    void adjustCurPosToPaintSelectionWhenContinueSelect();
+    void paintCursor(QPainter* painter) const;
+    void paintMovingHandles(QPainter* painter) const;
+    void showCursorForSelecting(QPainter* painter);
+    void drawCurPosPixmap(QPainter* painter) const;
+    static void drawHandle(QPainter* painter, const TouchState::End& end, const QPixmap& picture);
+    void paintShadowBlockFromPreviousCaretToCurrentCaret(QPainter* painter) const;
+
+    GraphicsText& m_item;
+    TouchState& m_state;
+};

@@ -1,0 +1,133 @@
+#include "canvas/CharacterFormat.h"
+
+#include "canvas/TextObjectConstants.h"
+#include "document/TextStyle.h"
+
+#include <QBrush>
+#include <QCache>
+#include <QFontInfo>
+#include <QGuiApplication>
+#include <QHash>
+#include <QPen>
+#include <algorithm>
+#include <cmath>
+
+namespace
+{
+
+constexpr int MaximumKerning = 1000;
+constexpr int MaximumOutline = 200;
+constexpr int CachedFonts = 128;
+
+struct FontKey {
+    QString family;
+    int pixelSize;
+    int kerning;
+    bool bold;
+    bool italic;
+
+    bool operator==(const FontKey&) const = default;
+};
+
+size_t qHash(const FontKey& key, size_t seed)
+{
+    return qHashMulti(seed, key.family, key.pixelSize, key.kerning, key.bold, key.italic);
+}
+
+struct FontStore {
+    QHash<QString, bool> installed;
+    QCache<FontKey, QFont> fonts{CachedFonts};
+};
+
+FontStore& store()
+{
+    static FontStore fontStore;
+    static bool connected = false;
+    if (!connected && qGuiApp) {
+        connected = true;
+        // A font that was imported may bring a missing family.
+        QObject::connect(qGuiApp, &QGuiApplication::fontDatabaseChanged, qGuiApp, [] {
+            fontStore.installed.clear();
+            fontStore.fonts.clear();
+        });
+        QObject::connect(qGuiApp, &QObject::destroyed, [] {
+            fontStore.installed.clear();
+            fontStore.fonts.clear();
+            connected = false;
+        });
+    }
+    return fontStore;
+}
+
+int kerning(const TextStyle& style)
+{
+    return std::clamp(style.getTextKerning(), 0, MaximumKerning);
+}
+
+} // namespace
+
+bool CharacterFormat::familyIsInstalled(const QString& family)
+{
+    if (family.isEmpty())
+        return false;
+    auto& installed = store().installed;
+    auto found = installed.constFind(family);
+    if (found == installed.constEnd()) {
+        // Names come from files: forget rather than grow without end.
+        if (installed.size() > CachedFonts)
+            installed.clear();
+        const QFont font(family);
+        found = installed.insert(family, QFontInfo(font).family() == font.family());
+    }
+    return found.value();
+}
+
+int CharacterFormat::pixelSize(const TextStyle& style, double ratio)
+{
+    const int size = std::clamp(style.getFontSize(), 1, TextObjectConstants::MAXIMUM_FONT_SIZE);
+    return std::max(1, int(std::lround(size * ratio)));
+}
+
+QFont CharacterFormat::font(const TextStyle& style, double ratio)
+{
+    const FontKey key{QString::fromStdString(style.getFontFamily()), pixelSize(style, ratio), kerning(style),
+                      style.isFontBold() != 0, style.isTextItalic() != 0};
+    auto& fonts = store().fonts;
+    if (const QFont* known = fonts.object(key))
+        return *known;
+    QFont font(key.family);
+    font.setPixelSize(key.pixelSize);
+    font.setWeight(key.bold ? QFont::Bold : QFont::Normal);
+    font.setItalic(key.italic);
+    font.setLetterSpacing(QFont::PercentageSpacing, key.kerning);
+    fonts.insert(key, new QFont(font));
+    return font;
+}
+
+QTextCharFormat CharacterFormat::layoutFormat(const TextStyle& style, double ratio)
+{
+    QTextCharFormat format;
+    format.setFontFamilies({QString::fromStdString(style.getFontFamily())});
+    format.setProperty(QTextFormat::FontPixelSize, pixelSize(style, ratio));
+    format.setFontWeight(style.isFontBold() ? QFont::Bold : QFont::Normal);
+    format.setFontItalic(style.isTextItalic() != 0);
+    format.setFontLetterSpacingType(QFont::PercentageSpacing);
+    format.setFontLetterSpacing(kerning(style));
+    QColor invisible = color(style.getFontColor());
+    invisible.setAlpha(0);
+    format.setForeground(QBrush(invisible));
+    if (!style.isTextEdge())
+        format.setTextOutline(QPen(Qt::NoPen));
+    return format;
+}
+
+QColor CharacterFormat::color(const std::string& text)
+{
+    const QColor result(QString::fromStdString(text));
+    return result.isValid() ? result : QColor(Qt::black);
+}
+
+int CharacterFormat::outlineWidth(const TextStyle& style, double ratio)
+{
+    return int(2 * std::clamp(style.textEdge().getEdgeWidth(), 0, MaximumOutline) * ratio);
+}

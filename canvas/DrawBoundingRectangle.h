@@ -1,0 +1,57 @@
+#pragma once
+
+#include <QImage>
+#include <QObject>
+#include <QPixmap>
+#include <QSize>
+#include <QStringList>
+
+class QPainter;
+
+// Paints the nine-piece backgrounds of panes and dialogs from the compiled-in pictures.
+class DrawBoundingRectangle : public QObject
+{
+    Q_OBJECT
+public:
+    explicit DrawBoundingRectangle(QObject* parent = nullptr);
+
+    // The background of one kind of widget, 1 to 9; any other kind gives a null pixmap. Pieces whose picture
+    // is missing stay transparent.
+    QPixmap paintBoundingRectangle(int kind);
+
+    // Order of the nine names of a list.
+    enum Piece {
+        BottomRight,
+        BottomCenter,
+        BottomLeft,
+        MiddleRight,
+        MiddleCenter,
+        MiddleLeft,
+        UpperRight,
+        UpperCenter,
+        UpperLeft,
+        PieceCount
+    };
+
+    // Builds a pixmap of the size from nine pictures: corners at their natural size, the rest stretched
+    // between.
+    QPixmap drawImage(const QStringList& names, const QSize& size);
+    // The same with the middle drawn first, so that the edges of a dialog lie over its filling.
+    QPixmap drawImageLikeAsKSDialog(const QStringList& names, const QSize& size);
+
+private:
+    bool loadPieces(const QStringList& names);
+    QSize getSpecifiedTopLeftImage() const;
+    QSize getSpecifiedBottomImage() const;
+    void drawTopImage(QPainter& painter, const QSize& size) const;
+    void drawMiddleImage(QPainter& painter, const QSize& size) const;
+    void drawBottomImage(QPainter& painter, const QSize& size) const;
+    void drawRow(QPainter& painter, int y, int height, int width, Piece left, Piece center,
+                 Piece right) const;
+
+    QStringList m_paneOne;
+    QStringList m_paneTwo;
+    QStringList m_dialogBase;
+    QStringList m_smallDialogBase;
+    QImage m_pieces[PieceCount];
+};

@@ -1,0 +1,128 @@
+#include "canvas/GlyphPathCache.h"
+
+#include <QCache>
+#include <QChar>
+#include <QGlyphRun>
+#include <QHash>
+#include <QPainterPathStroker>
+#include <QRawFont>
+#include <QTextLayout>
+#include <algorithm>
+
+namespace
+{
+
+// Enough for the distinct characters of two titles at both sizes.
+constexpr int CacheBytes = 2 * 1024 * 1024;
+constexpr int RememberedPenWidths = 2;
+
+struct GlyphKey {
+    QString family;
+    QString text;
+    int pixelSize;
+    int weight;
+    bool italic;
+    double spacing;
+
+    bool operator==(const GlyphKey&) const = default;
+};
+
+size_t qHash(const GlyphKey& key, size_t seed)
+{
+    return qHashMulti(seed, key.family, key.text, key.pixelSize, key.weight, key.italic, key.spacing);
+}
+
+bool mayBePicture(const QString& text)
+{
+    return std::any_of(text.begin(), text.end(), [](QChar c) {
+        return c.isSurrogate() || c.category() == QChar::Symbol_Other || c.unicode() == 0xFE0F;
+    });
+}
+
+// Fonts of coloured pictures have no outlines worth drawing.
+bool isPictureFont(const QRawFont& font)
+{
+    static QHash<QString, bool> known;
+    auto found = known.constFind(font.familyName());
+    if (found == known.constEnd()) {
+        const bool pictures = !font.fontTable("CBLC").isEmpty() || !font.fontTable("sbix").isEmpty() ||
+                              !font.fontTable("COLR").isEmpty();
+        found = known.insert(font.familyName(), pictures);
+    }
+    return found.value();
+}
+
+bool drawnAsPicture(const QFont& font, const QString& text)
+{
+    if (!mayBePicture(text))
+        return false;
+    QTextLayout layout(text, font);
+    layout.beginLayout();
+    layout.createLine();
+    layout.endLayout();
+    const QList<QGlyphRun> runs = layout.glyphRuns();
+    return std::any_of(runs.begin(), runs.end(),
+                       [](const QGlyphRun& run) { return isPictureFont(run.rawFont()); });
+}
+
+int bytesOf(const QPainterPath& path)
+{
+    return path.elementCount() * int(sizeof(QPainterPath::Element));
+}
+
+} // namespace
+
+GlyphPath::GlyphPath(const QFont& font, const QString& text) : m_hasPath(!drawnAsPicture(font, text))
+{
+    if (!m_hasPath)
+        return;
+    m_fill.addText(0.0, 0.0, font, text);
+    // Contours of one glyph may overlap.
+    m_fill.setFillRule(Qt::WindingFill);
+}
+
+const QPainterPath& GlyphPath::contour() const
+{
+    if (!m_contourMade) {
+        m_contour = m_fill.simplified();
+        m_contourMade = true;
+    }
+    return m_contour;
+}
+
+const QPainterPath& GlyphPath::outline(int penWidth) const
+{
+    const auto known = std::find_if(m_outlines.begin(), m_outlines.end(),
+                                    [penWidth](const auto& o) { return o->penWidth == penWidth; });
+    if (known != m_outlines.end())
+        return (*known)->area;
+    if (m_outlines.size() >= RememberedPenWidths)
+        m_outlines.erase(m_outlines.begin());
+    QPainterPathStroker stroker;
+    stroker.setWidth(penWidth);
+    stroker.setJoinStyle(Qt::SvgMiterJoin);
+    stroker.setCapStyle(Qt::SquareCap);
+    auto made = std::make_unique<Outline>(Outline{penWidth, stroker.createStroke(contour())});
+    made->area.setFillRule(Qt::WindingFill);
+    m_outlines.push_back(std::move(made));
+    return m_outlines.back()->area;
+}
+
+int GlyphPath::cost() const
+{
+    // Outlines come later and are about four times their contour; counted in advance.
+    return int(sizeof(GlyphPath)) + 6 * bytesOf(m_fill);
+}
+
+std::shared_ptr<const GlyphPath> GlyphPathCache::glyph(const QFont& font, const QString& text)
+{
+    using Entry = std::shared_ptr<const GlyphPath>;
+    static QCache<GlyphKey, Entry> cache(CacheBytes);
+    const GlyphKey key{font.family(), text,          font.pixelSize(),
+                       font.weight(), font.italic(), text.size() > 1 ? font.letterSpacing() : 0.0};
+    if (const Entry* known = cache.object(key))
+        return *known;
+    auto made = std::make_shared<const GlyphPath>(font, text);
+    cache.insert(key, new Entry(made), made->cost());
+    return made;
+}

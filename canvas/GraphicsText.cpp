@@ -1,0 +1,464 @@
+#include "canvas/GraphicsText.h"
+
+#include "canvas/IInputLanguageSource.h"
+#include "canvas/StyleDocument.h"
+#include "canvas/TextPainter.h"
+#include "canvas/TextStyleEditor.h"
+#include "canvas/TouchTextEditor.h"
+#include "support/LogManager.h"
+#include "touchui/KSInputContext.h"
+#include "touchui/KSSoftKeyboardCursorSettingEvent.h"
+
+#include <QClipboard>
+#include <QGraphicsDropShadowEffect>
+#include <QGraphicsScene>
+#include <QGraphicsSceneContextMenuEvent>
+#include <QGraphicsSceneMouseEvent>
+#include <QGuiApplication>
+#include <QKeyEvent>
+#include <QMimeData>
+#include <QPainter>
+#include <QTextCursor>
+#include <QTextDocument>
+#include <QTextOption>
+
+GraphicsText::GraphicsText(TText* record, int id, QGraphicsItem* parent, QGraphicsScene* scene)
+    : QGraphicsTextItem(parent), m_styles(std::make_unique<StyleDocument>())
+{
+    if (record)
+        m_styles->setCurrent(*record);
+    if (id != 0)
+        m_styles->current().setTextObjectID(id);
+    initDataForGraphicsText();
+    if (scene)
+        scene->addItem(this);
+}
+
+GraphicsText::GraphicsText(bool parentObject, QGraphicsItem* parent, QGraphicsScene* scene)
+    : QGraphicsTextItem(parent), m_styles(std::make_unique<StyleDocument>()), m_parentObject(parentObject)
+{
+    initDataForGraphicsText();
+    if (scene)
+        scene->addItem(this);
+}
+
+GraphicsText::~GraphicsText() = default;
+
+void GraphicsText::initDataForGraphicsText()
+{
+    m_painter = std::make_unique<TextPainter>(*this);
+    m_styleEditor = std::make_unique<TextStyleEditor>(*this);
+    m_touchEditor = std::make_unique<TouchTextEditor>(*this);
+
+    setFlag(ItemIsMovable);
+    setFlag(ItemIsSelectable);
+    setAcceptTouchEvents(true);
+    setAcceptDrops(false);
+    // Undo steps are formed from the records; the document's own would contradict them.
+    document()->setUndoRedoEnabled(false);
+    document()->setDocumentMargin(DOCUMENT_MARGIN);
+    QTextOption option = document()->defaultTextOption();
+    // An object is as wide as its longest line; rounding must not break that line.
+    option.setWrapMode(QTextOption::NoWrap);
+    document()->setDefaultTextOption(option);
+
+    m_shadowEffect = new QGraphicsDropShadowEffect;
+    m_shadowEffect->setColor(DROP_SHADOW_COLOR);
+    m_shadowEffect->setOffset(0.0, 0.0);
+    m_shadowEffect->setEnabled(false);
+    setGraphicsEffect(m_shadowEffect);
+
+    installEventFilter(this);
+    if (IInputLanguageSource* source = IInputLanguageSource::instance()) {
+        connect(source, &IInputLanguageSource::signalsInputLanguageInfo, this,
+                &GraphicsText::slotObjectDisplayInputLanguage);
+    }
+}
+
+// The pair
+
+GraphicsText* GraphicsText::parentTextItem() const
+{
+    QGraphicsItem* parent = parentItem();
+    return parent && parent->type() == Type ? static_cast<GraphicsText*>(parent) : nullptr;
+}
+
+GraphicsText* GraphicsText::childTextItem() const
+{
+    const QList<QGraphicsItem*> children = childItems();
+    for (QGraphicsItem* child : children) {
+        if (child->type() == Type)
+            return static_cast<GraphicsText*>(child);
+    }
+    return nullptr;
+}
+
+QGraphicsItem* GraphicsText::placedItem()
+{
+    GraphicsText* parent = parentTextItem();
+    return parent ? parent : this;
+}
+
+bool GraphicsText::isParentItem() const
+{
+    return m_parentObject && !childItems().isEmpty();
+}
+
+void GraphicsText::announceGeometryChange()
+{
+    if (GraphicsText* parent = parentTextItem())
+        parent->prepareGeometryChange();
+}
+
+void GraphicsText::parentFollows()
+{
+    GraphicsText* parent = parentTextItem();
+    if (!parent)
+        return;
+    parent->m_focusFlag = m_focusFlag;
+    if (parent->textInteractionFlags() != textInteractionFlags())
+        parent->setTextInteractionFlags(textInteractionFlags());
+    parent->update();
+}
+
+void GraphicsText::update(const QRectF& rect)
+{
+    QGraphicsTextItem::update(rect);
+    if (QGraphicsItem* parent = parentItem())
+        parent->update();
+}
+
+// Records and styles
+
+TText* GraphicsText::getItemTText() const
+{
+    return &m_styles->current();
+}
+
+TText* GraphicsText::getTextList() const
+{
+    auto copy = std::make_unique<TText>(m_styles->current());
+    copy->setText(toPlainText().toStdString());
+    return copy.release();
+}
+
+TText* GraphicsText::getLastAlpaTextStyleValue() const
+{
+    return &m_styles->lastAlpha();
+}
+
+void GraphicsText::setLastAlpaTextStyleValue(TText& style)
+{
+    m_styles->lastAlpha() = style;
+}
+
+void GraphicsText::initShowText()
+{
+    m_styleEditor->initShowText();
+    m_styles->refreshUndoBaseline();
+}
+
+void GraphicsText::resetDocument(TText* record, int cursorPos)
+{
+    if (!record)
+        return;
+    m_styleEditor->resetDocument(*record, cursorPos);
+    m_styles->refreshUndoBaseline();
+}
+
+int GraphicsText::getBoundingLineStatus() const
+{
+    if (m_focusFlag == FocusObject)
+        return textInteractionFlags() == Qt::NoTextInteraction ? FocusObject : FocusEdit;
+    return m_focusFlag;
+}
+
+int GraphicsText::getStatusId() const
+{
+    const QTextCursor cursor = textCursor();
+    if (cursor.hasSelection())
+        return 1;
+    if (getBoundingLineStatus() == FocusObject)
+        return 0;
+    if (getBoundingLineStatus() == FocusEdit && textInteractionFlags() == Qt::TextEditorInteraction)
+        return 2;
+    return -1;
+}
+
+void GraphicsText::setFocusFlag(int flag)
+{
+    m_focusFlag = flag;
+    update();
+}
+
+bool GraphicsText::isHandleCaret() const
+{
+    return m_touchEditor->isHandleCaret();
+}
+
+bool GraphicsText::isDoubleClickedSelection() const
+{
+    return m_touchEditor->isDoubleClickedSelection();
+}
+
+void GraphicsText::changeAllStyleWhenSelectionMode(TText* source, int id, bool overall, int undoFlag)
+{
+    if (source)
+        m_styleEditor->changeAllStyleWhenSelectionMode(*source, id, overall, undoFlag);
+}
+
+void GraphicsText::changeAllStyleWhenEditMode(TText* source, int id, bool overall, int undoFlag)
+{
+    changeAllStyleWhenSelectionMode(source, id, overall, undoFlag);
+}
+
+void GraphicsText::changeAllStyleWhenHasSelection(TText* source, int id)
+{
+    if (source)
+        m_styleEditor->changeAllStyleWhenHasSelection(*source, id);
+}
+
+void GraphicsText::changePartStyleWhenHasSelection(TText* source, int id, int undoFlag)
+{
+    if (source)
+        m_styleEditor->changePartStyleWhenHasSelection(*source, id, undoFlag);
+}
+
+void GraphicsText::saveStyleForNextInsert(TText* style, int undoFlag, int id)
+{
+    if (style)
+        m_styleEditor->saveStyleForNextInsert(*style, undoFlag, id);
+}
+
+void GraphicsText::setInputLanguage(int row)
+{
+    if (row >= 0 && row < LANGUAGE_ROWS)
+        mInputLanguage = row;
+}
+
+void GraphicsText::setFontFamilyEnsureMode(int mode)
+{
+    m_styleEditor->setFontFamilyEnsureMode(mode);
+}
+
+void GraphicsText::setRadio(double ratio, bool big)
+{
+    m_canvasRatio = ratio;
+    m_bigScene = big;
+    document()->setDocumentMargin(big ? BIG_DOCUMENT_MARGIN : DOCUMENT_MARGIN);
+    m_painter->invalidate();
+}
+
+void GraphicsText::initNewTextSelectAll()
+{
+    m_touchEditor->initNewTextSelectAll();
+}
+
+void GraphicsText::changeItemToSolidLineState()
+{
+    m_touchEditor->changeItemToSolidLineState();
+}
+
+void GraphicsText::pushLastEditTextIntoStack()
+{
+    m_styleEditor->pushLastEditTextIntoStack();
+}
+
+void GraphicsText::getSelectionInfo(int begin, int end, int current, int mode)
+{
+    m_touchEditor->getSelectionInfo(begin, end, current, mode);
+}
+
+void GraphicsText::showCurrentTextStyle()
+{
+    m_styleEditor->showCurrentTextStyle();
+}
+
+bool GraphicsText::isBlank() const
+{
+    return toPlainText().simplified().trimmed().isEmpty();
+}
+
+// Slots
+
+void GraphicsText::slotObjectDocumentChange(int position, int removed, int added)
+{
+    m_styleEditor->documentChanged(position, removed, added);
+}
+
+void GraphicsText::slotObjectPositionChanged()
+{
+    m_touchEditor->markPositionChanged();
+}
+
+void GraphicsText::slotUndoTimeOut()
+{
+    m_styleEditor->undoTimeOut();
+}
+
+void GraphicsText::slotLongPressed()
+{
+    m_touchEditor->longPressed();
+}
+
+void GraphicsText::slotObjectDisplayInputLanguage(SystemSetupDef::emInputLanguageType language)
+{
+    mInputLanguage = languageRow(language);
+}
+
+// Geometry and painting
+
+void GraphicsText::setBoundingRectFlag(bool flag)
+{
+    if (m_boundingRectFlag == flag)
+        return;
+    prepareGeometryChange();
+    m_boundingRectFlag = flag;
+}
+
+QRectF GraphicsText::limitedBoundingRect() const
+{
+    const QRectF raster = m_bigScene ? BIG_SCENE_RECT : SCENE_RECT;
+    const QRectF limit = raster.adjusted(-LIMITEDNUM, -LIMITEDNUM, LIMITEDNUM, LIMITEDNUM);
+    const QRectF own(QPointF(0.0, 0.0), layoutRect().size());
+    return own.intersected(limit.translated(-scenePos()));
+}
+
+QRectF GraphicsText::boundingRect() const
+{
+    if (m_boundingRectFlag)
+        return limitedBoundingRect();
+    const GraphicsText* child = m_parentObject ? childTextItem() : nullptr;
+    if (!child)
+        return layoutRect();
+    // The frame runs around the child.
+    constexpr double pen = ITEMBOUNDINGWIDTH / 2.0;
+    return layoutRect().united(child->layoutRect()).adjusted(-pen, -pen, pen, pen);
+}
+
+void GraphicsText::paint(QPainter* painter, const QStyleOptionGraphicsItem*, QWidget*)
+{
+    // Neither Qt's selection frame nor the document's own caret is wanted, and its glyphs are invisible: the
+    // base class has nothing to paint.
+    painter->save();
+    if (m_parentObject) {
+        m_painter->drawItemBoundingRect(painter);
+    } else {
+        m_touchEditor->paintBelowGlyphs(painter);
+        m_painter->drawSelection(painter);
+        m_painter->drawItemText(painter);
+        if (getBoundingLineStatus() == FocusEdit)
+            m_touchEditor->paintAboveGlyphs(painter);
+    }
+    painter->restore();
+}
+
+// Events
+
+void GraphicsText::mousePressEvent(QGraphicsSceneMouseEvent* event)
+{
+    if (m_parentObject)
+        QGraphicsTextItem::mousePressEvent(event);
+    else
+        m_touchEditor->mousePress(event);
+}
+
+void GraphicsText::mouseMoveEvent(QGraphicsSceneMouseEvent* event)
+{
+    if (m_parentObject)
+        QGraphicsTextItem::mouseMoveEvent(event);
+    else
+        m_touchEditor->mouseMove(event);
+}
+
+void GraphicsText::mouseReleaseEvent(QGraphicsSceneMouseEvent* event)
+{
+    if (m_parentObject)
+        QGraphicsTextItem::mouseReleaseEvent(event);
+    else
+        m_touchEditor->mouseRelease(event);
+}
+
+void GraphicsText::mouseDoubleClickEvent(QGraphicsSceneMouseEvent* event)
+{
+    if (m_parentObject)
+        QGraphicsTextItem::mouseDoubleClickEvent(event);
+    else
+        m_touchEditor->mouseDoubleClick(event);
+}
+
+void GraphicsText::contextMenuEvent(QGraphicsSceneContextMenuEvent* event)
+{
+    if (!event) {
+        LOG_DEBUG_OPERATE(L"Edit Area", 200, L"ContextMenu has no Event ");
+        return;
+    }
+    event->accept();
+}
+
+void GraphicsText::keyPressEvent(QKeyEvent* event)
+{
+    if (m_parentObject) {
+        QGraphicsTextItem::keyPressEvent(event);
+        return;
+    }
+    // Pasted text takes the style of the place it comes to, not the one it had elsewhere.
+    if (event->matches(QKeySequence::Paste) && textInteractionFlags() == Qt::TextEditorInteraction) {
+        textCursor().insertText(QGuiApplication::clipboard()->text());
+        event->accept();
+        return;
+    }
+    m_touchEditor->keyPress(event);
+}
+
+void GraphicsText::focusOutEvent(QFocusEvent* event)
+{
+    if (!m_parentObject) {
+        LOG_DEBUG_OPERATE(L"Edit Area", 200,
+                          L"focus out focus position " + std::to_wstring(textCursor().position()));
+    }
+    QGraphicsTextItem::focusOutEvent(event);
+}
+
+void GraphicsText::dragEnterEvent(QGraphicsSceneDragDropEvent*)
+{
+}
+
+void GraphicsText::dragLeaveEvent(QGraphicsSceneDragDropEvent*)
+{
+}
+
+void GraphicsText::dragMoveEvent(QGraphicsSceneDragDropEvent*)
+{
+}
+
+void GraphicsText::dropEvent(QGraphicsSceneDragDropEvent*)
+{
+}
+
+void GraphicsText::customEvent(QEvent* event)
+{
+    if (m_parentObject)
+        return;
+    if (event->type() == QEvent::Type(KSInputContext::SoftKeyBoardCloseType)) {
+        m_touchEditor->keyboardClosed();
+    } else if (event->type() == KSSoftKeyboardCursorSettingEvent::myType) {
+        const auto& setting = static_cast<KSSoftKeyboardCursorSettingEvent&>(*event);
+        getSelectionInfo(setting.getCursorBeginPos(), setting.getCursorEndPos(),
+                         setting.getCursorCurrentPos(), setting.getCursorSelectionMode());
+    }
+}
+
+bool GraphicsText::eventFilter(QObject* watched, QEvent* event)
+{
+    if (watched == this && !m_parentObject && m_touchEditor->filter(event))
+        return true;
+    return QGraphicsTextItem::eventFilter(watched, event);
+}
+
+QVariant GraphicsText::itemChange(GraphicsItemChange change, const QVariant& value)
+{
+    if (change == ItemSelectedHasChanged && !m_parentObject)
+        Q_EMIT signalObjectSelectedHasChanged(this);
+    return QGraphicsTextItem::itemChange(change, value);
+}

@@ -1,0 +1,44 @@
+#pragma once
+
+#include <QEventPoint>
+#include <QGraphicsView>
+#include <QList>
+#include <QTimer>
+
+class QTouchEvent;
+
+// View of the canvas: turns the first finger into mouse events for the scene. Two touches within 350 ms are a
+// double click, movements within the drag distance are jitter and dropped.
+class GraphicsView : public QGraphicsView
+{
+    Q_OBJECT
+public:
+    explicit GraphicsView(QGraphicsScene* scene, QWidget* parent = nullptr);
+
+Q_SIGNALS:
+    // A finger was lifted; sent before the release reaches the scene.
+    void deleteEmptyItem();
+
+public Q_SLOTS:
+    // Ends the time in which a second touch makes a double click.
+    void mouseClick();
+
+protected:
+    bool viewportEvent(QEvent* event) override;
+    void mousePressEvent(QMouseEvent* event) override;
+    void mouseReleaseEvent(QMouseEvent* event) override;
+    void mouseMoveEvent(QMouseEvent* event) override;
+    void mouseDoubleClickEvent(QMouseEvent* event) override;
+
+private:
+    void getTouchPoints(QEvent* event);
+    void touchBegin(const QTouchEvent& touch);
+    void touchUpdate(const QTouchEvent& touch);
+    void touchEnd(const QTouchEvent& touch);
+
+    QTimer m_clickTimer;
+    // Widget coordinates of the viewport.
+    int m_lastPressX = 0;
+    int m_lastPressY = 0;
+    QList<QEventPoint> m_touchPoints;
+};

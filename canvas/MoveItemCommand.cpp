@@ -1,0 +1,39 @@
+#include "canvas/MoveItemCommand.h"
+
+#include "canvas/CanvasScene.h"
+#include "document/TText.h"
+
+MoveItemCommand::MoveItemCommand(CanvasScene* scene, int id, QPointF oldPosition, QPointF newPosition,
+                                 QUndoCommand* parent)
+    : QUndoCommand(parent)
+    , m_scene(scene)
+    , m_oldPosition(oldPosition)
+    , m_newPosition(newPosition)
+    , m_objectId(id)
+{
+}
+
+void MoveItemCommand::moveTo(QPointF position)
+{
+    m_scene->saveArchiveFlag();
+    if (GraphicsText* item = m_scene->findTextItem(m_objectId)) {
+        item->getItemTText()->setXValue(float(position.x()));
+        item->getItemTText()->setYValue(float(position.y()));
+        if (GraphicsText* parent = item->parentTextItem())
+            parent->setPos(position);
+        item->setPos(0.0, 0.0);
+        item->changeItemToSolidLineState();
+    }
+    m_scene->update();
+    m_scene->saveArchive();
+}
+
+void MoveItemCommand::undo()
+{
+    moveTo(m_oldPosition);
+}
+
+void MoveItemCommand::redo()
+{
+    moveTo(m_newPosition);
+}

@@ -1,0 +1,63 @@
+#include "canvas/NewTextStyle.h"
+
+#include "document/FontStyle.h"
+
+#include <memory>
+#include <vector>
+
+NewTextStyle::NewTextStyle(const QString& sample, const FontStyle& font)
+{
+    std::vector<TextStyle*> items;
+    for (const QChar c : sample) {
+        auto style = std::make_unique<TextStyle>();
+        style->setText(QString(c).toStdString());
+        style->setFontFamily(font.getFamily());
+        style->setFontColor(font.getColor());
+        style->setFontSize(font.getSize());
+        style->setFontBold(font.getBold());
+        style->setIsTextItalic(font.getItalic());
+        style->setTextKerning(font.getKerning());
+        style->setIsTextEdge(font.getEdge());
+        style->setTextEdge(*font.getEdgePoint());
+        items.push_back(style.release());
+    }
+    m_last.setText(sample.toStdString());
+    m_last.setTextItems(std::move(items));
+    m_last.setShadowStyle(font.getShadowStyle());
+    m_last.setTextShadow(*font.getShadowPoint());
+    m_last.setTextAlign(font.getAlign());
+    m_property = m_last;
+}
+
+void NewTextStyle::rememberChange(const TText& style)
+{
+    if (style.textItems().empty())
+        return;
+    m_last.setTextAlign(style.getTextAlign());
+    m_last.setShadowStyle(style.getShadowStyle());
+    m_last.setTextShadow(*style.getTextShadow());
+    auto first = std::make_unique<TextStyle>(*style.textItems().front());
+    m_last.releaseVectorTextStyle();
+    m_last.setTextItems({first.release()});
+}
+
+void NewTextStyle::applyTo(TText& record) const
+{
+    record.setShadowStyle(m_property.getShadowStyle());
+    record.setTextShadow(*m_property.getTextShadow());
+    record.setTextAlign(m_property.getTextAlign());
+}
+
+TText NewTextStyle::firstCharacter(const QString& family) const
+{
+    auto style = std::make_unique<TextStyle>();
+    if (!m_last.textItems().empty())
+        *style = *m_last.textItems().front();
+    style->setText(std::string());
+    if (!family.isEmpty())
+        style->setFontFamily(family.toStdString());
+    TText record;
+    applyTo(record);
+    record.setTextItems({style.release()});
+    return record;
+}

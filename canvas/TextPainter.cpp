@@ -1,0 +1,161 @@
+#include "canvas/TextPainter.h"
+
+#include "canvas/CharacterFormat.h"
+#include "canvas/GraphicsText.h"
+#include "canvas/StyleDocument.h"
+
+#include <QAbstractTextDocumentLayout>
+#include <QApplication>
+#include <QPainter>
+#include <QPalette>
+#include <QTextBlock>
+#include <QTextBoundaryFinder>
+#include <QTextCursor>
+
+namespace
+{
+// Baseline of a character within the height of its line.
+constexpr double BaselineShare = 0.85;
+constexpr double CaretShift = 1.0;
+constexpr double FrameRadius = 1.0;
+const QColor SelectedFill(0, 128, 255, 77);
+const QColor EditFill(0, 0, 0, 77);
+} // namespace
+
+TextPainter::TextPainter(GraphicsText& item) : m_item(item), m_carets(*item.document())
+{
+}
+
+void TextPainter::invalidate()
+{
+    m_valid = false;
+    m_carets.invalidate();
+}
+
+void TextPainter::addGlyph(int position, const QString& text, const CaretGeometry::Caret& caret)
+{
+    const TextStyle* style = m_item.styles().at(position);
+    if (!style)
+        return;
+    Glyph glyph;
+    glyph.font = CharacterFormat::font(*style, m_item.canvasRatio());
+    glyph.path = GlyphPathCache::glyph(glyph.font, text);
+    if (glyph.path->hasPath() && glyph.path->fill().isEmpty())
+        return;
+    glyph.baseline = QPointF(caret.x - CaretShift, caret.top + BaselineShare * caret.height);
+    glyph.color = CharacterFormat::color(style->getFontColor());
+    glyph.edge = style->isTextEdge() != 0;
+    if (glyph.edge) {
+        glyph.edgeColor = CharacterFormat::color(style->textEdge().getEdgeColor());
+        glyph.edgeWidth = CharacterFormat::outlineWidth(*style, m_item.canvasRatio());
+    }
+    if (!glyph.path->hasPath())
+        glyph.text = text;
+    m_glyphs.push_back(std::move(glyph));
+}
+
+void TextPainter::collectBlock(const QTextBlock& block)
+{
+    m_carets.caretsOfBlock(block, m_blockCarets);
+    const QString text = block.text();
+    QTextBoundaryFinder finder(QTextBoundaryFinder::Grapheme, text);
+    qsizetype begin = 0;
+    while (begin < text.size()) {
+        finder.setPosition(begin);
+        qsizetype end = finder.toNextBoundary();
+        if (end <= begin)
+            end = text.size();
+        if (text.at(begin) != QChar::LineSeparator)
+            addGlyph(block.position() + int(begin), text.mid(begin, end - begin),
+                     m_blockCarets[size_t(begin)]);
+        begin = end;
+    }
+}
+
+void TextPainter::collectGlyphs()
+{
+    if (m_valid)
+        return;
+    // Held until the new ones are made, so that a full cache does not make them again.
+    const std::vector<Glyph> previous = std::move(m_glyphs);
+    m_glyphs.clear();
+    m_glyphs.reserve(previous.size() + 1);
+    for (QTextBlock block = m_item.document()->begin(); block.isValid(); block = block.next())
+        collectBlock(block);
+    m_valid = true;
+}
+
+void TextPainter::drawItemTextOutLine(QPainter* painter, const QTransform& origin) const
+{
+    for (const Glyph& glyph : m_glyphs) {
+        if (!glyph.edge || !glyph.path->hasPath())
+            continue;
+        painter->setWorldTransform(QTransform(origin).translate(glyph.baseline.x(), glyph.baseline.y()));
+        if (glyph.edgeWidth > 0) {
+            painter->fillPath(glyph.path->outline(glyph.edgeWidth), glyph.edgeColor);
+        } else {
+            const QPen hairline(glyph.edgeColor, 0, Qt::SolidLine, Qt::SquareCap, Qt::SvgMiterJoin);
+            painter->strokePath(glyph.path->contour(), hairline);
+        }
+    }
+}
+
+void TextPainter::drawItemText(QPainter* painter)
+{
+    collectGlyphs();
+    const bool antialiasing = painter->testRenderHint(QPainter::Antialiasing);
+    const QTransform origin = painter->worldTransform();
+    painter->setRenderHint(QPainter::Antialiasing);
+    drawItemTextOutLine(painter, origin);
+    for (const Glyph& glyph : m_glyphs) {
+        painter->setWorldTransform(QTransform(origin).translate(glyph.baseline.x(), glyph.baseline.y()));
+        if (glyph.path->hasPath()) {
+            painter->fillPath(glyph.path->fill(), glyph.color);
+        } else {
+            painter->setFont(glyph.font);
+            painter->setPen(glyph.color);
+            painter->drawText(QPointF(), glyph.text);
+        }
+    }
+    painter->setWorldTransform(origin);
+    painter->setRenderHint(QPainter::Antialiasing, antialiasing);
+}
+
+void TextPainter::drawItemBoundingRect(QPainter* painter)
+{
+    const GraphicsText* child = m_item.childTextItem();
+    if (!child)
+        return;
+    const int status = child->getBoundingLineStatus();
+    if (status == FocusNone || (status == FocusEdit && child->getFocusFlag() != FocusEdit))
+        return;
+    const QRectF frame = child->boundingRect();
+    if (status == FocusObject) {
+        painter->setPen(QPen(QColor(ITEMBOUNDINGSOLIDCOLOR), ITEMBOUNDINGWIDTH, Qt::SolidLine));
+        painter->setBrush(SelectedFill);
+        painter->drawRoundedRect(frame, FrameRadius, FrameRadius);
+        return;
+    }
+    painter->setPen(QPen(QColor(ITEMBOUNDINGDOTUPCOLOR), ITEMBOUNDINGWIDTH, Qt::SolidLine));
+    painter->setBrush(EditFill);
+    painter->drawRoundedRect(frame, FrameRadius, FrameRadius);
+    painter->setPen(QPen(QColor(ITEMBOUNDINGDOTDOWNCOLOR), ITEMBOUNDINGWIDTH, Qt::DotLine));
+    painter->setBrush(Qt::NoBrush);
+    painter->drawRoundedRect(frame, FrameRadius, FrameRadius);
+}
+
+void TextPainter::drawSelection(QPainter* painter)
+{
+    const QTextCursor cursor = m_item.textCursor();
+    if (!cursor.hasSelection())
+        return;
+    QAbstractTextDocumentLayout::PaintContext context;
+    context.palette = QApplication::palette();
+    const auto group = m_item.hasFocus() ? QPalette::Active : QPalette::Inactive;
+    QAbstractTextDocumentLayout::Selection selection;
+    selection.cursor = cursor;
+    selection.format.setBackground(context.palette.brush(group, QPalette::Highlight));
+    selection.format.setForeground(context.palette.brush(group, QPalette::HighlightedText));
+    context.selections.append(selection);
+    m_item.document()->documentLayout()->draw(painter, context);
+}

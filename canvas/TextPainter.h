@@ -1,0 +1,61 @@
+#pragma once
+
+#include "canvas/CaretGeometry.h"
+#include "canvas/GlyphPathCache.h"
+#include "canvas/TextObjectConstants.h"
+
+#include <QColor>
+#include <QFont>
+#include <QPointF>
+#include <QString>
+#include <memory>
+#include <vector>
+
+class GraphicsText;
+class QPainter;
+class QTextBlock;
+class QTransform;
+
+// Paints one text object: outlines below glyphs, frames, selections. Keeps what it draws until the text, a
+// style or the layout changes. A character and the marks on it are drawn as one with the style of the
+// character, since a mark finds its base only in one font; each position keeps its own style in the record.
+// GUI thread only.
+class TextPainter : public TextObjectConstants
+{
+public:
+    explicit TextPainter(GraphicsText& item);
+
+    // Call when text, styles or layout changed.
+    void invalidate();
+    CaretGeometry& carets() { return m_carets; }
+
+    void drawItemText(QPainter* painter);
+    // Frame of the pair; called for the parent.
+    void drawItemBoundingRect(QPainter* painter);
+    // Highlights the selection of the text cursor.
+    void drawSelection(QPainter* painter);
+
+private:
+    struct Glyph {
+        QPointF baseline;
+        std::shared_ptr<const GlyphPath> path;
+        QColor color;
+        QColor edgeColor;
+        int edgeWidth = 0;
+        bool edge = false;
+        // For characters without an outline.
+        QFont font;
+        QString text;
+    };
+
+    void collectGlyphs();
+    void collectBlock(const QTextBlock& block);
+    void addGlyph(int position, const QString& text, const CaretGeometry::Caret& caret);
+    void drawItemTextOutLine(QPainter* painter, const QTransform& origin) const;
+
+    GraphicsText& m_item;
+    CaretGeometry m_carets;
+    std::vector<Glyph> m_glyphs;
+    std::vector<CaretGeometry::Caret> m_blockCarets;
+    bool m_valid = false;
+};

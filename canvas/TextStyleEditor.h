@@ -1,0 +1,81 @@
+#pragma once
+
+#include "canvas/TextObjectConstants.h"
+#include "document/TText.h"
+
+#include <QTextCursor>
+#include <QTimer>
+
+class GraphicsText;
+class StyleDocument;
+
+// Keeps the Qt document of a text object and its style record in step: typing goes from the document into the
+// record, style changes and loading from the record into the document. Also forms the undo steps of typing.
+// Lengths are item coordinates. GUI thread only.
+class TextStyleEditor : public TextObjectConstants
+{
+public:
+    explicit TextStyleEditor(GraphicsText& item);
+
+    void initShowText();
+    void resetDocument(const TText& record, int cursorPosition);
+
+    // The document reports a change that was not made here.
+    void documentChanged(int position, int removed, int added);
+
+    void changeAllStyleWhenSelectionMode(const TText& source, int id, bool overall, int undoFlag);
+    void changeAllStyleWhenHasSelection(const TText& source, int id);
+    void changePartStyleWhenHasSelection(const TText& source, int id, int undoFlag);
+    void saveStyleForNextInsert(const TText& style, int undoFlag, int id);
+    void setFontFamilyEnsureMode(int mode);
+
+    // Tells the panel the style at the cursor or of the selection.
+    void showCurrentTextStyle();
+    // The same for the whole text, leaving no selection.
+    void showStyleOfWholeText();
+    void selectWholeText();
+    void clearSelection();
+    // Tells the panel the object's style with its place, which becomes the state that undo returns to.
+    void reportMovedObject();
+    // Offset (0,0) switches the shadow off.
+    void applyShadow();
+
+    // Typing up to now becomes an undo step.
+    void pushLastEditTextIntoStack();
+    void undoTimeOut();
+
+private:
+    class Guard;
+
+    // Substitutes a missing family and reports it.
+    void ensureFamily(TextStyle& style);
+    void insertRecord();
+    void applyFormats(int begin, int end);
+    int cutOffCharsBeyondMaxNum(int position, int added);
+    void replaceCharacters(int position, int removed, int added);
+    void charsAddedChange(int position, int added);
+    void charsRemovedChange(int position, int count);
+    void styleNewCharacter(int position, bool startOfLine, QChar character, TextStyle& style);
+    bool startsFilledLine(int position, int added) const;
+    void reconcile();
+    void startBurst();
+    void changeSelectionProperty(int id, const TText& source, int from, int to);
+    void changeSelectionPropertyWhenObjectIsEmpty(int id, const TText& source);
+    void changeTextItemPosition(float x, float y);
+    void updateWidthAndAlign(double oldWidth);
+    bool adjustLeftAndRightMargin();
+    void setDocumentAlign(double oldWidth, double width);
+    void setCaretHeight(const TextStyle& style);
+    void reportStyle(const TextStyle& style);
+    void showTextStyleOfCursorPosition(const QTextCursor& cursor);
+    void emitEdited(TText& before, TText& beforeLast);
+
+    GraphicsText& m_item;
+    StyleDocument& m_styles;
+    QTimer m_undoTimer;
+    double m_lastWidth = 0.0;
+    int m_guard = 0;
+    int m_undoFlag = 1;
+    int m_ensureMode = 2;
+    bool m_ensurePending = false;
+};

@@ -1,0 +1,30 @@
+// One entry of the title list's option menu.
+#pragma once
+
+#include <QAction>
+
+class ArchiveAction : public QAction
+{
+    Q_OBJECT
+
+public:
+    // No entry has number 4.
+    enum ARCHIVE_ACTION_TYPE {
+        ACTION_CREATE = 0,
+        ACTION_COPY = 1,
+        ACTION_PASTE = 2,
+        ACTION_DELETE = 3,
+        ACTION_ADD_USER = 5,
+    };
+
+    ArchiveAction(const QString& text, ARCHIVE_ACTION_TYPE type, QObject* parent)
+        : QAction(text, parent), mType(type)
+    {
+    }
+
+    ARCHIVE_ACTION_TYPE getActionType() const { return mType; }
+    void setActionType(ARCHIVE_ACTION_TYPE type) { mType = type; }
+
+private:
+    ARCHIVE_ACTION_TYPE mType;
+};

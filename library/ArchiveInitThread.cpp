@@ -1,0 +1,37 @@
+#include "library/ArchiveInitThread.h"
+
+#include "document/Archive.h"
+
+#include <QMetaMethod>
+#include <QMutexLocker>
+#include <utility>
+
+ArchiveInitThread::ArchiveInitThread(QString folder, QObject* parent)
+    : QThread(parent), mFolder(std::move(folder))
+{
+}
+
+ArchiveInitThread::~ArchiveInitThread()
+{
+    cancel();
+    wait();
+    QMutexLocker lock(&mMutex);
+    qDeleteAll(mArchives);
+    mArchives.clear();
+}
+
+void ArchiveInitThread::run()
+{
+    QList<Archive*> archives = mController.getArchiveList(mFolder);
+    {
+        // Not held during the announcement, which waits for the GUI thread.
+        QMutexLocker lock(&mMutex);
+        const QMetaMethod finished =
+            QMetaMethod::fromSignal(&ArchiveInitThread::threadGetArchiveListFinished);
+        if (mCancelled || !isSignalConnected(finished)) {
+            mArchives = archives;
+            return;
+        }
+    }
+    emit threadGetArchiveListFinished(archives);
+}

@@ -1,0 +1,229 @@
+#include "library/ArchiveItem.h"
+
+#include "document/Archive.h"
+#include "document/TText.h"
+
+#include <QBrush>
+#include <QFontMetrics>
+#include <QGraphicsPixmapItem>
+#include <QGraphicsScene>
+#include <QGraphicsView>
+#include <QImageReader>
+#include <QLabel>
+#include <QPainter>
+#include <QPixmap>
+#include <algorithm>
+
+const QPoint ArchiveItem::LEFT_CHILD_POS(3, 2);
+const QPoint ArchiveItem::RIGHT_CHILD_POS(250, 2);
+QString ArchiveItem::SYSTEM_FONT_FAMILY = QStringLiteral("KST");
+
+const QString ArchiveItem::OPERATE_AND_SELECT_STATE = QStringLiteral(
+    "ArchiveItem{border: 2px solid rgb(0,186,230);background-color: qlineargradient(spread:pad, x1:0, y1:0, "
+    "x2:0, y2:1, stop:0 rgb(64, 94, 185), stop:1 rgb(24, 55, 164))}");
+const QString ArchiveItem::OPERATE_AND_UN_SELECT_STATE =
+    QStringLiteral("ArchiveItem{border: 2px solid rgb(0,186,230);Background:rgb(51, 51, 51)}");
+const QString ArchiveItem::UN_OPERATE_AND_SELECT_STATE = QStringLiteral(
+    "ArchiveItem{border: 0px; background: qlineargradient(spread:pad, x1:0, y1:0, x2:0, y2:1, stop:0 rgb(64, "
+    "94, 185), stop:1 rgb(24, 55, 164))}");
+const QString ArchiveItem::UN_OPERATE_AND_UN_SELECT_STATE =
+    QStringLiteral("ArchiveItem{Background:rgb(51, 51, 51)}");
+
+namespace
+{
+
+const int NARROW_LABEL_WIDTH = 250;
+const int NARROW_LABEL_HEIGHT = 24;
+const int CHECKER_SQUARE = 8; // pixels
+
+QBrush checkerBrush()
+{
+    const QPixmap checker(QStringLiteral(":/checker"));
+    if (!checker.isNull())
+        return QBrush(checker);
+    // Without the picture collection transparency still has to be told from black.
+    QPixmap drawn(2 * CHECKER_SQUARE, 2 * CHECKER_SQUARE);
+    drawn.fill(QColor(102, 102, 102));
+    QPainter painter(&drawn);
+    painter.fillRect(0, 0, CHECKER_SQUARE, CHECKER_SQUARE, QColor(153, 153, 153));
+    painter.fillRect(CHECKER_SQUARE, CHECKER_SQUARE, CHECKER_SQUARE, CHECKER_SQUARE, QColor(153, 153, 153));
+    return QBrush(drawn);
+}
+
+} // namespace
+
+ArchiveItem::ArchiveItem(Archive* archive, int type, QWidget* parent)
+    : QFrame(parent), mArchive(archive), mType(type)
+{
+    setFixedSize(mType == NARROW_ITEM ? RIGHT_CHILD_WIDTH : WIDGET_WIDTH, WIDGET_HEIGHT);
+    setFocusPolicy(Qt::NoFocus);
+    setAttribute(Qt::WA_StyledBackground);
+    setStyleSheet(UN_OPERATE_AND_UN_SELECT_STATE);
+}
+
+ArchiveItem::~ArchiveItem() = default;
+
+QString ArchiveItem::getArchiveDataPath() const
+{
+    return mArchive ? QString::fromStdString(mArchive->getPath()) : QString();
+}
+
+void ArchiveItem::updateArchiveData(Archive* archive)
+{
+    if (!archive || !mArchive)
+        return;
+    const std::string name = mArchive->getName();
+    *mArchive = *archive;
+    mArchive->setName(name);
+}
+
+void ArchiveItem::initArchiveItemChildWidget()
+{
+    if (hasChildWidgets())
+        return;
+    if (mType == LIST_ITEM)
+        createLeftChild();
+    createRightChild();
+    updateLeftChild(QImage());
+    updateRightChild();
+}
+
+void ArchiveItem::createLeftChild()
+{
+    mScene = new QGraphicsScene(0, 0, LEFT_CHILD_WIDTH, CHILD_HEIGHT, this);
+    mScene->setBackgroundBrush(checkerBrush());
+    mPixmapItem = mScene->addPixmap(QPixmap());
+    mView = new QGraphicsView(mScene, this);
+    mView->setAttribute(Qt::WA_TransparentForMouseEvents);
+    mView->setEnabled(false);
+    mView->setStyleSheet(QStringLiteral("border:0;"));
+    mView->setHorizontalScrollBarPolicy(Qt::ScrollBarAlwaysOff);
+    mView->setVerticalScrollBarPolicy(Qt::ScrollBarAlwaysOff);
+    mView->setFixedSize(LEFT_CHILD_WIDTH, CHILD_HEIGHT);
+    mView->move(LEFT_CHILD_POS);
+    mView->show();
+}
+
+void ArchiveItem::createRightChild()
+{
+    const bool narrow = mType == NARROW_ITEM;
+    mTextWidget = new QWidget(this);
+    mTextWidget->setObjectName(QStringLiteral("mTextWidget"));
+    mTextWidget->setAttribute(Qt::WA_TransparentForMouseEvents);
+    if (narrow)
+        mTextWidget->setStyleSheet(QStringLiteral(" QWidget#mTextWidget { background:rgb(38, 38, 38); }"));
+    mTextWidget->setFixedSize(RIGHT_CHILD_WIDTH, CHILD_HEIGHT);
+    mTextWidget->move(narrow ? QPoint(0, RIGHT_CHILD_POS.y()) : RIGHT_CHILD_POS);
+
+    const QSize line =
+        narrow ? QSize(NARROW_LABEL_WIDTH, NARROW_LABEL_HEIGHT) : QSize(DISPLY_TEXT_SIZE_LENTH, LABEL_HEIGHT);
+    for (int i = 0; i < LEFT_CHILD_LABEL_COUNT; ++i) {
+        auto* label = new QLabel(mTextWidget);
+        label->setTextFormat(Qt::PlainText);
+        label->setStyleSheet(narrow ? QStringLiteral(" background: transparent; color:rgb(178, 178, 178);")
+                                    : QStringLiteral(" background: transparent; color:rgb(220, 220, 220);"));
+        label->setFixedSize(line);
+        label->move(0, i * line.height());
+        mLabels.append(label);
+    }
+    mTextWidget->show();
+}
+
+void ArchiveItem::updateContents(QImage image)
+{
+    updateLeftChild(image);
+    updateRightChild();
+}
+
+void ArchiveItem::updateLeftChild(QImage image)
+{
+    if (!mPixmapItem || !mArchive)
+        return;
+    if (image.isNull()) {
+        const QString path = mArchive->getFullPathOfThumbnailSmall();
+        if (!path.isEmpty())
+            image = QImageReader(path).read();
+    }
+    mPixmapItem->setPixmap(image.isNull() ? QPixmap() : QPixmap::fromImage(image));
+}
+
+void ArchiveItem::updateRightChild()
+{
+    if (!hasChildWidgets())
+        return;
+    QFont font(SYSTEM_FONT_FAMILY);
+    font.setPixelSize(mType == NARROW_ITEM ? NARROW_LABEL_HEIGHT - 4 : DISPLY_TEXT_SIZE);
+    for (QLabel* label : mLabels) {
+        label->setFont(font);
+        label->clear();
+    }
+    setTextArea();
+}
+
+void ArchiveItem::setTextArea()
+{
+    if (!mArchive)
+        return;
+    const std::vector<TText*>& texts = mArchive->text();
+    if (texts.size() == 1)
+        setOneTextArea(QString::fromStdString(texts.front()->getText()));
+    else if (texts.size() > 1)
+        setManyTextArea();
+}
+
+void ArchiveItem::setOneTextArea(const QString& text)
+{
+    QString rest = text.simplified();
+    for (QLabel* label : mLabels) {
+        if (rest.isEmpty())
+            return;
+        setLabelText(rest, label);
+        const QString shown = label->text();
+        if (shown == rest)
+            return;
+        // The last character shown is the ellipsis. A line always takes something, or a character wider than
+        // the line would fill all lines with ellipses.
+        rest = rest.mid(std::max<qsizetype>(shown.size() - 1, 1)).trimmed();
+    }
+}
+
+void ArchiveItem::setManyTextArea()
+{
+    std::vector<TText*> texts = mArchive->getText();
+    std::stable_sort(texts.begin(), texts.end(), [](const TText* left, const TText* right) {
+        return left->getTextObjectID() < right->getTextObjectID();
+    });
+    const qsizetype lines = std::min<qsizetype>(mLabels.size(), static_cast<qsizetype>(texts.size()));
+    for (qsizetype i = 0; i < lines; ++i)
+        setLabelText(QString::fromStdString(texts[static_cast<size_t>(i)]->getText()).simplified(),
+                     mLabels.at(i));
+}
+
+void ArchiveItem::setLabelText(const QString& text, QLabel* label)
+{
+    label->setText(QFontMetrics(label->font()).elidedText(text, Qt::ElideRight, label->width()));
+}
+
+QStringList ArchiveItem::textLines() const
+{
+    QStringList lines;
+    for (const QLabel* label : mLabels)
+        lines.append(label->text());
+    return lines;
+}
+
+ArchiveItem* ArchiveItem::clone() const
+{
+    auto archive = mArchive ? std::make_unique<Archive>(*mArchive) : std::make_unique<Archive>();
+    auto* item = new ArchiveItem(archive.get(), mType);
+    item->mOwnArchive = std::move(archive);
+    item->initArchiveItemChildWidget();
+    item->setSelected(mSelected);
+    item->setStyleSheet(mSelected ? OPERATE_AND_SELECT_STATE : OPERATE_AND_UN_SELECT_STATE);
+    return item;
+}
+
+void ArchiveItem::setSystemFontFamily(QString family)
+{
+    SYSTEM_FONT_FAMILY = family;
+}

@@ -1,0 +1,380 @@
+#include "library/ArchiveList.h"
+
+#include "document/Archive.h"
+#include "document/ArchiveController.h"
+#include "document/ArchiveOrder.h"
+#include "library/ArchiveInitThread.h"
+#include "library/ArchiveItem.h"
+#include "library/ArchiveMenu.h"
+#include "library/FocusArchiveCommand.h"
+#include "library/ITitlerFolderReporter.h"
+#include "support/LogManager.h"
+
+#include <QCoreApplication>
+#include <QDir>
+#include <QEvent>
+#include <QFileInfo>
+#include <QLabel>
+#include <string>
+
+namespace
+{
+
+const int ITEMS_IN_VIEW = 6;    // before the list scrolls to the selection
+const int LOADER_POLL = 1;      // ms
+const int LABEL_FONT_SIZE = 13; // points
+
+} // namespace
+
+ArchiveList::ArchiveList(QLabel* folderLabel, bool autoInit, QWidget* parent)
+    : ArchiveColumn(parent)
+    , mController(std::make_unique<ArchiveController>())
+    , mFiles(*mController)
+    , mFolderLabel(folderLabel)
+    , mMenuFont(QStringLiteral("KST"))
+{
+    mMenuFont.setPixelSize(MENU_FONT_SIZE);
+    if (mFolderLabel) {
+        QFont font = mFolderLabel->font();
+        font.setPointSize(LABEL_FONT_SIZE);
+        mFolderLabel->setFont(font);
+        mFolderLabel->setTextFormat(Qt::PlainText);
+        mFolderLabel->setText(tr("Folder"));
+    }
+    initArchiveListConnect();
+    mController->reCreateOrderXml();
+    if (autoInit)
+        initArchiveList();
+}
+
+ArchiveList::~ArchiveList()
+{
+    endInitThread();
+    clearOldArchiveList();
+}
+
+void ArchiveList::initArchiveListConnect()
+{
+    connect(this, &ArchiveColumn::widgetItemPressed, this, [this] { mLongHold = false; });
+    connect(this, &ArchiveColumn::widgetItemReleased, this, &ArchiveList::itemReleasedEvent);
+    connect(this, &ArchiveColumn::widgetItemLongHold, this, &ArchiveList::itemLongHoldEvent);
+    connect(this, &ArchiveColumn::widgetItemRightPressed, this, &ArchiveList::itemRightPressedEvent);
+    connect(this, &ArchiveList::signalAddArchiveData, this, &ArchiveList::slotAddArchiveData,
+            Qt::QueuedConnection);
+    connect(this, &ArchiveList::signalAddOneArchiveData, this, &ArchiveList::slotAddOneArchiveData,
+            Qt::QueuedConnection);
+}
+
+void ArchiveList::initArchiveList()
+{
+    const QString last = mController->getLastFolderPath();
+    const auto folders = mController->getFolderList();
+    if (!last.isEmpty() && QDir(last).exists())
+        mCurrentPath = last;
+    else if (!folders.isEmpty())
+        mCurrentPath = QString::fromStdString(folders.front());
+
+    ITitlerFolderReporter* reporter = ITitlerFolderReporter::instance();
+    if (reporter && !mCurrentPath.isEmpty())
+        reporter->editFolderStartStatus(mCurrentPath);
+    LOG_DEBUG_OPERATE(L"ArchiveList", 200,
+                      L"ArchiveList_initArchiveList() Path:" + mCurrentPath.toStdWString());
+    initArchiveListData();
+}
+
+void ArchiveList::initArchiveListData()
+{
+    if (mCurrentPath.isEmpty())
+        return;
+    setFolderLabel();
+    endInitThread();
+    mInitThread = std::make_unique<ArchiveInitThread>(mCurrentPath);
+    connect(mInitThread.get(), &ArchiveInitThread::threadGetArchiveListFinished, this,
+            &ArchiveList::getArchiveListSuccessed, Qt::BlockingQueuedConnection);
+    mInitThread->start(QThread::InheritPriority);
+}
+
+// The loader may be waiting for this thread to take its titles: they are let in and thrown away.
+void ArchiveList::endInitThread()
+{
+    if (!mInitThread)
+        return;
+    mInitThread->cancel();
+    mIgnoreLoaded = true;
+    while (!mInitThread->wait(LOADER_POLL))
+        QCoreApplication::sendPostedEvents(this, QEvent::MetaCall);
+    mIgnoreLoaded = false;
+    mInitThread.reset();
+}
+
+void ArchiveList::getArchiveListSuccessed(QList<Archive*> archivesList)
+{
+    if (mIgnoreLoaded) {
+        qDeleteAll(archivesList);
+        return;
+    }
+    clearOldArchiveList();
+    addRecords(archivesList);
+    if (isEmpty()) {
+        emit startTemplatePicker();
+        return;
+    }
+    selectArchive(0);
+    emit signalAddArchiveData();
+}
+
+void ArchiveList::addRecords(const QList<Archive*>& archives)
+{
+    mArchives = archives;
+    for (Archive* archive : mArchives)
+        addWidgetItem(createBaseItem(archive), -1);
+}
+
+ArchiveItem* ArchiveList::createBaseItem(Archive* archive)
+{
+    auto* item = new ArchiveItem(archive, ArchiveItem::LIST_ITEM, this);
+    mAllItems.append(item);
+    return item;
+}
+
+ArchiveItem* ArchiveList::createPasteUndoItem(Archive* archive, ArchiveItem* item)
+{
+    if (!item)
+        item = createBaseItem(archive);
+    item->initArchiveItemChildWidget();
+    return item;
+}
+
+void ArchiveList::slotAddArchiveData()
+{
+    for (int i = 0; i < count(); ++i)
+        emit signalAddOneArchiveData(getWidgetItem(i));
+}
+
+void ArchiveList::slotAddOneArchiveData(ArchiveItem* item)
+{
+    // The folder may have changed while the call was queued.
+    if (mAllItems.contains(item))
+        item->initArchiveItemChildWidget();
+}
+
+void ArchiveList::initArchiveListRefreshData()
+{
+    setFolderLabel();
+    addRecords(mController->getArchiveList(mCurrentPath));
+    if (ITitlerFolderReporter* reporter = ITitlerFolderReporter::instance())
+        reporter->editFolderStartStatus(mCurrentPath);
+}
+
+void ArchiveList::setFolderLabel()
+{
+    if (mFolderLabel)
+        mFolderLabel->setText(mCurrentPath.section(QLatin1Char('/'), -1, -1, QString::SectionSkipEmpty));
+}
+
+ArchiveItem* ArchiveList::getCurrentOperationArchive() const
+{
+    return mOperationItem;
+}
+
+ArchiveItem* ArchiveList::getSelectedArchive() const
+{
+    return mSelectedItem;
+}
+
+int ArchiveList::getItemIndex(ArchiveItem* item) const
+{
+    return getIndexOfWidgetItem(item);
+}
+
+ArchiveItem* ArchiveList::findItem(const QString& path) const
+{
+    for (ArchiveItem* item : mAllItems) {
+        if (item->getArchiveDataPath() == path)
+            return item;
+    }
+    return nullptr;
+}
+
+void ArchiveList::selectArchive(int index)
+{
+    ArchiveItem* item = getWidgetItem(index);
+    if (mSelectedItem != item)
+        setDefaultItemState(mSelectedItem);
+    if (item) {
+        setSelectItemState(item);
+        saveLastArchivePathAndNotifyCanvasUpdate(item);
+    } else {
+        mSelectedItem.clear();
+        emit signalUpdateCanvas(nullptr);
+    }
+}
+
+void ArchiveList::selectOperationArchive(int index)
+{
+    if (ArchiveItem* item = getWidgetItem(index)) {
+        if (mOperationItem != item)
+            clearOperationItemState(mOperationItem);
+        setOperationItemState(item);
+    }
+}
+
+void ArchiveList::setSelectItemState(ArchiveItem* item)
+{
+    if (!item)
+        return;
+    mSelectedItem = item;
+    LOG_USER_OPERATE(L"Thumbnail", 200,
+                     L"Select  the " + std::to_wstring(getItemIndex(item)) + L" Thumbnail");
+    moveCurrentArchiveItemVisble();
+    item->setStyleSheet(ArchiveItem::UN_OPERATE_AND_SELECT_STATE);
+    item->setSelected(true);
+}
+
+void ArchiveList::setDefaultItemState(ArchiveItem* item)
+{
+    if (!item)
+        return;
+    item->setStyleSheet(ArchiveItem::UN_OPERATE_AND_UN_SELECT_STATE);
+    item->setSelected(false);
+    emit itemSetDefaultState();
+}
+
+void ArchiveList::setOperationItemState(ArchiveItem* item)
+{
+    if (!item)
+        return;
+    mOperationItem = item;
+    item->setStyleSheet(item == mSelectedItem ? ArchiveItem::OPERATE_AND_SELECT_STATE
+                                              : ArchiveItem::OPERATE_AND_UN_SELECT_STATE);
+}
+
+void ArchiveList::clearOperationItemState(ArchiveItem* item)
+{
+    if (!item)
+        return;
+    item->setStyleSheet(item == mSelectedItem ? ArchiveItem::UN_OPERATE_AND_SELECT_STATE
+                                              : ArchiveItem::UN_OPERATE_AND_UN_SELECT_STATE);
+}
+
+void ArchiveList::clearOldFlagState()
+{
+    clearOperationItemState(mOperationItem);
+    mOperationItem.clear();
+    mLongHold = false;
+}
+
+void ArchiveList::saveLastArchivePathAndNotifyCanvasUpdate(ArchiveItem* item)
+{
+    if (!item)
+        return;
+    mController->setLastArchivePath(item->getArchiveDataPath());
+    emit signalUpdateCanvas(item->getArchiveData());
+}
+
+void ArchiveList::moveCurrentArchiveItemVisble()
+{
+    const int selected = getItemIndex(mSelectedItem);
+    if (count() <= ITEMS_IN_VIEW || selected < 0)
+        return;
+    const int last = lastVisibleItem();
+    if (selected < firstVisibleItem())
+        moveToWidgetItem(selected);
+    else if (selected > last || (selected == last && isCutAtBottom(selected)))
+        moveToWidgetItem(selected - ITEMS_IN_VIEW);
+}
+
+void ArchiveList::itemReleasedEvent(ArchiveItem* item, QPoint)
+{
+    if (mMoveMode != 0)
+        return;
+    if (item && !mLongHold) {
+        if (item == mSelectedItem) {
+            if (item == mOperationItem)
+                setSelectItemState(item);
+        } else {
+            ArchiveItem* old = mSelectedItem;
+            setSelectItemState(item);
+            setDefaultItemState(old);
+            saveLastArchivePathAndNotifyCanvasUpdate(item);
+            emit focusCommandSignal(new FocusArchiveCommand(this, item, old));
+        }
+    }
+    mLongHold = false;
+}
+
+QList<ArchiveOrder*> ArchiveList::getArchiveOrderList() const
+{
+    QList<ArchiveOrder*> orders;
+    for (int i = 0; i < count(); ++i) {
+        auto* order = new ArchiveOrder;
+        order->setArchiveIndex(i);
+        order->setArchivePath(QFileInfo(getWidgetItem(i)->getArchiveDataPath()).fileName().toStdString());
+        orders.append(order);
+    }
+    return orders;
+}
+
+void ArchiveList::saveArchiveListOrder()
+{
+    const QList<ArchiveOrder*> orders = getArchiveOrderList();
+    mController->saveArchiveListOrder(mCurrentPath, orders);
+    qDeleteAll(orders);
+}
+
+void ArchiveList::startPicker()
+{
+    emit startTemplatePicker();
+}
+
+void ArchiveList::refreshBaseItem(QString archiveFilePath, QImage leftImage)
+{
+    LOG_DEBUG_OPERATE(L"ArchiveList", 200, L"refreshBaseItem " + archiveFilePath.toStdWString());
+    ArchiveItem* item = findItem(archiveFilePath);
+    if (!item)
+        return;
+    Archive archive;
+    if (mController->getOneArchive(archiveFilePath, &archive))
+        item->updateArchiveData(&archive);
+    item->updateContents(leftImage);
+}
+
+void ArchiveList::setMainScene(CanvasScene* mainScene)
+{
+    mMainScene = mainScene;
+}
+
+void ArchiveList::clearOldArchiveList()
+{
+    removeAll();
+    qDeleteAll(mAllItems); // those that undo commands still hold, too: the commands see it
+    mAllItems.clear();
+    qDeleteAll(mArchives);
+    mArchives.clear();
+}
+
+void ArchiveList::resetPositions()
+{
+    mSelectedItem.clear();
+    mOperationItem.clear();
+    mOperationPosition = -1;
+    mSelectedPosition = -1;
+    mPressPosition = -1;
+    mLongHold = false;
+}
+
+void ArchiveList::cleanArchiveList()
+{
+    endInitThread();
+    clearOldArchiveList();
+    resetPositions();
+    mCurrentPath.clear();
+    if (mFolderLabel)
+        mFolderLabel->clear();
+}
+
+void ArchiveList::synchronizationFolderFile()
+{
+    if (!mCurrentPath.isEmpty())
+        mController->deleteUnusefulArchives(mCurrentPath);
+}

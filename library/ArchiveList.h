@@ -1,0 +1,181 @@
+// The column of thumbnails: the titles of the current folder, in the folder's order.
+//
+// A tap selects a title and sends it to the canvas; a right click or a long hold opens the option menu, from
+// which titles are created, copied, pasted and deleted. Every change goes out as an undo command, which the
+// receiver takes over and pushes. The selected item is the title on the canvas, the operation item the one
+// that the menu acts on. GUI thread only.
+#pragma once
+
+#include "document/Archive.h"
+#include "library/ArchiveColumn.h"
+#include "library/TitleFileOperations.h"
+
+#include <QFont>
+#include <QImage>
+#include <QList>
+#include <QPointer>
+#include <QString>
+#include <memory>
+
+class ArchiveController;
+class ArchiveInitThread;
+class ArchiveItem;
+class ArchiveMenu;
+class ArchiveOrder;
+class CanvasScene;
+class ITitlerAPPEventFilterController;
+class QAction;
+class QLabel;
+class QUndoCommand;
+
+class ArchiveList : public ArchiveColumn
+{
+    Q_OBJECT
+
+public:
+    static const int LIMIT_REMAIN = 200; // with KB_MILLION: kilobytes that must stay free on the disk
+    static const int KB_MILLION = 1000;
+    static const int MENU_FONT_SIZE = 28; // pixels
+
+    // The label shows the name of the folder; it is not owned and must outlive the list. With autoInit the
+    // last folder, or else the first one, is opened at once.
+    ArchiveList(QLabel* folderLabel, bool autoInit, QWidget* parent = nullptr);
+    ~ArchiveList() override;
+
+    QString getCurrentPath() const { return mCurrentPath; }
+    ArchiveItem* getCurrentOperationArchive() const;
+    ArchiveItem* getSelectedArchive() const;
+    bool IsOptionMenuShowing() const;
+    int getItemIndex(ArchiveItem* item) const;
+    // 0 off, 1 on.
+    int getMoveState() const { return mMoveMode; }
+
+    // Opens the last folder, or else the first one; its titles follow from a thread of their own.
+    void initArchiveList();
+
+    // Selects the item and shows it on the canvas; an index outside the list clears both.
+    void selectArchive(int index);
+    // Moves the border to the item.
+    void selectOperationArchive(int index);
+    void setSelectItemState(ArchiveItem* item);
+    void setDefaultItemState(ArchiveItem* item);
+    void setOperationItemState(ArchiveItem* item);
+    void clearOperationItemState(ArchiveItem* item);
+    void clearOldFlagState();
+    // Remembers the title as the last one and sends it to the canvas.
+    void saveLastArchivePathAndNotifyCanvasUpdate(ArchiveItem* item);
+
+    // Empties the list, the path and the label.
+    void cleanArchiveList();
+    void clearCopyArchive();
+    // Removes the files of titles that are no longer in the list.
+    void synchronizationFolderFile();
+    void stopArchiveListTapAndHoldTimer() { stopTapAndHoldTimer(); }
+    void setSystemLanFont(QString family);
+    void translateText();
+
+    // An item without its child widgets, which follow when it is on screen. The list is its parent.
+    ArchiveItem* createBaseItem(Archive* archive);
+    // The given item, or a new, complete one of the record.
+    ArchiveItem* createPasteUndoItem(Archive* archive, ArchiveItem* item);
+
+    // One entry an item, with its index and file name; the caller owns the entries.
+    QList<ArchiveOrder*> getArchiveOrderList() const;
+    void saveArchiveListOrder();
+
+    // Emits startTemplatePicker. Any thread.
+    void startPicker();
+
+    bool checkArchiveListIsFull() const;
+    bool checkDiskSpaceIsFull() const;
+
+signals:
+    // Null: there is no title to show. The record stays the list's.
+    void signalUpdateCanvas(const Archive* archive);
+    // The receiver owns the command.
+    void deleteCommandSignal(QUndoCommand* command);
+    void pasteCommandSignal(QUndoCommand* command);
+    void createCommandSignal(QUndoCommand* command);
+    void focusCommandSignal(QUndoCommand* command);
+    void moveCommandSignal(QUndoCommand* command);
+    void addUserSignal(QString name);
+    void signalStartMove(ArchiveItem* item);
+    void signalItemsCanDrag(bool canDrag);
+    void startTemplatePicker();
+    void startUserTemplatePicker();
+    // A title is no longer selected: the canvas makes its pictures now.
+    void itemSetDefaultState();
+    void archiveListMenuShow();
+    void cleanUndoStack();
+    void signalAddArchiveData();
+    void signalAddOneArchiveData(ArchiveItem* item);
+    void signalStartPasteArchive();
+
+public slots:
+    void slotHideOptionMenu();
+    void slotMenuAboutToClose();
+    void moveButtonClicked(bool isMoveMode);
+    void slotAddArchiveData();
+    void slotAddOneArchiveData(ArchiveItem* item);
+    // A title has been saved: reads it again and shows the picture in its item.
+    void refreshBaseItem(QString archiveFilePath, QImage leftImage);
+    void itemLongHoldEvent(ArchiveItem* item, QPoint pos);
+    void itemReleasedEvent(ArchiveItem* item, QPoint pos);
+    void itemRightPressedEvent(ArchiveItem* item, QPoint pos);
+    void selectOptionMenuItem(QAction* action);
+    // Makes a title from the template's record, behind the operation item.
+    void createArchiveFromTemplate(Archive* temp);
+    void refreshArchiveList(QString path);
+    void refreshArchiveListForChangeFolderName(QString before, QString after);
+    void refreshArchiveListInFile(QString path, QString fileName);
+    // Takes over the records.
+    void getArchiveListSuccessed(QList<Archive*> archivesList);
+    void moveCurrentArchiveItemVisble();
+    // Not owned.
+    void setMainScene(CanvasScene* mainScene);
+    void wheelEvent(QWheelEvent* event) override;
+
+private:
+    void initArchiveListConnect();
+    void initArchiveListData();
+    void initArchiveListRefreshData();
+    void endInitThread();
+    void openFolder(const QString& path);
+    void clearOldArchiveList();
+    void resetPositions();
+    void setFolderLabel();
+    void addRecords(const QList<Archive*>& archives);
+    void offerTemplateOrReportFull();
+    void showOptionMenu(ArchiveItem* item, QPoint pos);
+    void createOptionMenu();
+    // Sibling processes know that a popup is open, and a press in one of them closes it.
+    void sendTitlerAppEvent(bool open);
+    void exeCreateArchive();
+    void exeCopyArchive();
+    void exePasteArchive();
+    void exeDeleteArchive();
+    void emitPasteCommand(std::unique_ptr<Archive> archive);
+    ArchiveItem* findItem(const QString& path) const;
+
+    std::unique_ptr<ArchiveController> mController;
+    TitleFileOperations mFiles;
+    std::unique_ptr<ArchiveInitThread> mInitThread;
+    bool mIgnoreLoaded = false; // a loader that is being ended may still deliver
+    std::unique_ptr<ArchiveMenu> mMenu;
+    QList<Archive*> mArchives;     // owned
+    QList<ArchiveItem*> mAllItems; // listed or held by an undo command; owned by the column
+    std::unique_ptr<Archive> mCopyArchive;
+    TitlePictures mCopyPictures;
+    QLabel* mFolderLabel;
+    CanvasScene* mMainScene = nullptr;
+    QPointer<ITitlerAPPEventFilterController> mEventController;
+    QString mCurrentPath;
+    QFont mMenuFont;
+    QPointer<ArchiveItem> mSelectedItem;
+    QPointer<ArchiveItem> mOperationItem;
+    int mOperationPosition = -1;
+    int mSelectedPosition = -1;
+    int mPressPosition = -1;
+    int mMoveMode = 0;
+    bool mLongHold = false; // the release of the finger that opened the menu selects nothing
+};

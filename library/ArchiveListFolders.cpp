@@ -1,0 +1,107 @@
+// How the title list opens folders: on request, for one file, and after a folder was renamed.
+#include "document/Archive.h"
+#include "document/ArchiveController.h"
+#include "library/ArchiveItem.h"
+#include "library/ArchiveList.h"
+#include "library/IEditContext.h"
+#include "library/ITitlerFolderReporter.h"
+#include "library/ListMessages.h"
+#include "support/LogManager.h"
+
+namespace
+{
+
+bool isCreateNew()
+{
+    IEditContext* context = IEditContext::instance();
+    return context && context->isCreateNew();
+}
+
+} // namespace
+
+void ArchiveList::openFolder(const QString& path)
+{
+    endInitThread();
+    mController->setLastFolderPath(path);
+    setDefaultItemState(mSelectedItem);
+    clearOperationItemState(mOperationItem);
+    ITitlerFolderReporter* reporter = ITitlerFolderReporter::instance();
+    if (reporter && !mCurrentPath.isEmpty())
+        reporter->editFolderEndStatus(mCurrentPath);
+    mCurrentPath = path;
+    clearOldArchiveList();
+    resetPositions();
+    initArchiveListRefreshData();
+}
+
+void ArchiveList::refreshArchiveList(QString path)
+{
+    openFolder(path);
+    emit signalAddArchiveData();
+    if (!isEmpty() && !isCreateNew()) {
+        selectArchive(0);
+    } else if (!checkArchiveListIsFull()) {
+        emit signalUpdateCanvas(nullptr);
+        emit startTemplatePicker();
+    } else {
+        selectArchive(0);
+        ListMessages::post(MessageDef::MESSAGE_LIST_FULL_ON_CREATE, ListMessages::limitText());
+    }
+}
+
+void ArchiveList::refreshArchiveListInFile(QString path, QString fileName)
+{
+    LOG_DEBUG_OPERATE(L"ArchiveList", 200, L" File:" + fileName.toStdWString());
+    openFolder(path);
+    emit signalAddArchiveData();
+
+    ArchiveItem* wanted = nullptr;
+    const QString filePath = path + QLatin1Char('/') + fileName;
+    for (int i = 0; i < count() && !wanted; ++i) {
+        if (getWidgetItem(i)->getArchiveDataPath() == filePath)
+            wanted = getWidgetItem(i);
+    }
+    if (wanted)
+        selectArchive(getItemIndex(wanted));
+    if (isCreateNew()) {
+        offerTemplateOrReportFull();
+    } else if (!wanted) {
+        if (isEmpty()) {
+            emit signalUpdateCanvas(nullptr);
+            emit startTemplatePicker();
+        } else {
+            selectArchive(0);
+        }
+    }
+}
+
+void ArchiveList::offerTemplateOrReportFull()
+{
+    if (checkArchiveListIsFull())
+        ListMessages::post(MessageDef::MESSAGE_LIST_FULL_ON_CREATE, ListMessages::limitText());
+    else
+        emit startTemplatePicker();
+}
+
+void ArchiveList::refreshArchiveListForChangeFolderName(QString before, QString after)
+{
+    LOG_DEBUG_OPERATE(L"ArchiveList", 200,
+                      L"ArchiveList_refreshArchiveListForChangeFolderName() Enter Before:" +
+                          before.toStdWString() + L" After:" + after.toStdWString());
+    if (before != mCurrentPath)
+        return;
+    endInitThread();
+    mController->setLastFolderPath(after);
+    const int selected = getItemIndex(mSelectedItem);
+    setDefaultItemState(mSelectedItem);
+    mCurrentPath = after;
+    clearOldArchiveList();
+    resetPositions();
+    initArchiveListRefreshData();
+    if (isEmpty()) {
+        emit startTemplatePicker();
+        return;
+    }
+    selectArchive(qBound(0, selected, count() - 1));
+    emit signalAddArchiveData();
+}

@@ -1,0 +1,266 @@
+// What the operator does to titles through the option menu of the list.
+#include "document/Archive.h"
+#include "library/ArchiveItem.h"
+#include "library/ArchiveList.h"
+#include "library/ArchiveMenu.h"
+#include "library/DeleteArchiveCommand.h"
+#include "library/IEditContext.h"
+#include "library/ListMessages.h"
+#include "library/PasteArchiveCommand.h"
+#include "support/LogManager.h"
+#include "support/SystemInfo.h"
+#include "touchui/ITitlerAPPEventFilterController.h"
+
+#include <QLabel>
+#include <QWheelEvent>
+#include <string>
+
+namespace
+{
+
+std::wstring logText(ArchiveAction::ARCHIVE_ACTION_TYPE type)
+{
+    switch (type) {
+    case ArchiveAction::ACTION_CREATE:
+        return L"Select  Create New in the ";
+    case ArchiveAction::ACTION_COPY:
+        return L"Select Copy in the ";
+    case ArchiveAction::ACTION_PASTE:
+        return L"Select Paste in the ";
+    case ArchiveAction::ACTION_DELETE:
+        return L"Select Delete in the ";
+    case ArchiveAction::ACTION_ADD_USER:
+        return L"Select Add User in the ";
+    }
+    return {};
+}
+
+} // namespace
+
+bool ArchiveList::checkArchiveListIsFull() const
+{
+    return count() > ListMessages::TITLE_LIMIT - 1;
+}
+
+bool ArchiveList::checkDiskSpaceIsFull() const
+{
+    return SystemInfo::getInstance()->getDiskRemainSize(mCurrentPath.toStdWString()) <
+           LIMIT_REMAIN * KB_MILLION;
+}
+
+void ArchiveList::itemLongHoldEvent(ArchiveItem* item, QPoint pos)
+{
+    if (mMoveMode != 0)
+        return;
+    mLongHold = true;
+    showOptionMenu(item, pos);
+}
+
+void ArchiveList::itemRightPressedEvent(ArchiveItem* item, QPoint pos)
+{
+    if (mMoveMode == 0)
+        showOptionMenu(item, pos);
+}
+
+void ArchiveList::createOptionMenu()
+{
+    if (mMenu)
+        return;
+    mMenu = std::make_unique<ArchiveMenu>(this);
+    connect(mMenu.get(), &QMenu::triggered, this, &ArchiveList::selectOptionMenuItem);
+    connect(mMenu.get(), &ArchiveMenu::signalMenuAboutToClose, this, &ArchiveList::slotMenuAboutToClose);
+}
+
+void ArchiveList::showOptionMenu(ArchiveItem* item, QPoint pos)
+{
+    createOptionMenu();
+    const bool hasCopy = mCopyArchive != nullptr;
+    if (item) {
+        mOperationPosition = getItemIndex(item);
+        mPressPosition = mOperationPosition;
+        clearOperationItemState(mOperationItem);
+        setOperationItemState(item);
+    } else {
+        mOperationPosition = count() - 1;
+    }
+    mMenu->enableFor(item != nullptr, hasCopy);
+    mMenu->setFont(mMenuFont);
+
+    QPoint anchor = item ? item->mapToGlobal(pos) : mapToGlobal(pos);
+    // In the lower part of the list the menu opens upwards, so that it stays on the screen.
+    const int upperPart = 4 * (height() / 7);
+    if (mapFromGlobal(anchor).y() >= upperPart)
+        anchor.ry() -= mMenu->sizeHint().height();
+    mMenu->popup(anchor);
+    sendTitlerAppEvent(true);
+    emit archiveListMenuShow();
+}
+
+void ArchiveList::sendTitlerAppEvent(bool open)
+{
+    if (!mEventController) {
+        mEventController = ITitlerAPPEventFilterController::getInstance();
+        if (!mEventController)
+            return;
+        connect(mEventController, &ITitlerAPPEventFilterController::signalRestoreOriginal, this,
+                &ArchiveList::slotHideOptionMenu);
+    }
+    mEventController->sendAPPEvent(APPEventDefine::LOCKTYPE_OBJECT, open);
+}
+
+bool ArchiveList::IsOptionMenuShowing() const
+{
+    return mMenu && mMenu->isVisible();
+}
+
+void ArchiveList::slotHideOptionMenu()
+{
+    if (!IsOptionMenuShowing())
+        return;
+    mMenu->hide();
+    sendTitlerAppEvent(false);
+}
+
+void ArchiveList::slotMenuAboutToClose()
+{
+    sendTitlerAppEvent(false);
+    clearOperationItemState(mOperationItem);
+}
+
+void ArchiveList::wheelEvent(QWheelEvent* event)
+{
+    slotHideOptionMenu();
+    ArchiveColumn::wheelEvent(event);
+}
+
+void ArchiveList::moveButtonClicked(bool isMoveMode)
+{
+    mMoveMode = isMoveMode ? 1 : 0;
+    emit signalItemsCanDrag(isMoveMode);
+    if (!isMoveMode)
+        clearOperationItemState(mOperationItem);
+}
+
+void ArchiveList::selectOptionMenuItem(QAction* action)
+{
+    const auto* entry = qobject_cast<ArchiveAction*>(action);
+    if (!entry)
+        return;
+    LOG_USER_OPERATE(L"Thumbnail", 200,
+                     logText(entry->getActionType()) + std::to_wstring(mOperationPosition) + L" Thumbnail");
+    switch (entry->getActionType()) {
+    case ArchiveAction::ACTION_CREATE:
+        setOperationItemState(mOperationItem);
+        exeCreateArchive();
+        break;
+    case ArchiveAction::ACTION_COPY:
+        exeCopyArchive();
+        break;
+    case ArchiveAction::ACTION_PASTE:
+        exePasteArchive();
+        break;
+    case ArchiveAction::ACTION_DELETE:
+        setOperationItemState(mOperationItem);
+        exeDeleteArchive();
+        break;
+    case ArchiveAction::ACTION_ADD_USER:
+        break; // never enabled, see ArchiveMenu::enableFor
+    }
+}
+
+void ArchiveList::exeCreateArchive()
+{
+    if (checkArchiveListIsFull())
+        ListMessages::post(MessageDef::MESSAGE_LIST_FULL_ON_CREATE, ListMessages::limitText());
+    else if (checkDiskSpaceIsFull())
+        ListMessages::post(MessageDef::MESSAGE_DISK_FULL_ON_CREATE, tr("File"));
+    else
+        emit startTemplatePicker();
+}
+
+void ArchiveList::createArchiveFromTemplate(Archive* temp)
+{
+    if (!temp)
+        return;
+    std::unique_ptr<Archive> archive = mFiles.createFromTemplate(mCurrentPath, *temp);
+    if (!archive)
+        return;
+    IEditContext* context = IEditContext::instance();
+    if (mOperationPosition == -1 && context && context->isCreateNew())
+        mOperationPosition = count() - 1;
+    emitPasteCommand(std::move(archive));
+}
+
+void ArchiveList::emitPasteCommand(std::unique_ptr<Archive> archive)
+{
+    mSelectedPosition = getItemIndex(mSelectedItem);
+    Archive* record = archive.release();
+    mArchives.append(record);
+    emit pasteCommandSignal(new PasteArchiveCommand(this, record, mOperationPosition, mSelectedPosition));
+}
+
+void ArchiveList::clearCopyArchive()
+{
+    mCopyArchive.reset();
+    mCopyPictures = TitlePictures();
+}
+
+void ArchiveList::exeCopyArchive()
+{
+    if (!mOperationItem || !mOperationItem->getArchiveData())
+        return;
+    clearCopyArchive();
+    mCopyArchive = std::make_unique<Archive>(*mOperationItem->getArchiveData());
+    mCopyPictures = TitleFileOperations::loadPictures(*mCopyArchive);
+    setOperationItemState(mOperationItem); // the border stays on
+}
+
+void ArchiveList::exePasteArchive()
+{
+    if (checkArchiveListIsFull()) {
+        ListMessages::post(MessageDef::MESSAGE_LIST_FULL_ON_PASTE, ListMessages::limitText());
+        return;
+    }
+    if (checkDiskSpaceIsFull()) {
+        ListMessages::post(MessageDef::MESSAGE_DISK_FULL_ON_PASTE);
+        return;
+    }
+    if (!mCopyArchive)
+        return;
+    std::unique_ptr<Archive> archive = mFiles.createFromCopy(mCurrentPath, *mCopyArchive, mCopyPictures);
+    if (!archive)
+        return;
+    emitPasteCommand(std::move(archive));
+    emit signalStartPasteArchive();
+}
+
+void ArchiveList::exeDeleteArchive()
+{
+    if (!mOperationItem)
+        return;
+    clearOperationItemState(mOperationItem);
+    const int position = getItemIndex(mOperationItem);
+    if (position < 0)
+        return;
+    mOperationPosition = position;
+    mSelectedPosition = getItemIndex(mSelectedItem);
+    emit deleteCommandSignal(
+        new DeleteArchiveCommand(this, mOperationItem, position, mOperationItem == mSelectedItem));
+}
+
+void ArchiveList::setSystemLanFont(QString family)
+{
+    mMenuFont = QFont(family);
+    mMenuFont.setPixelSize(MENU_FONT_SIZE);
+    ArchiveItem::setSystemFontFamily(family);
+    for (int i = 0; i < count(); ++i)
+        getWidgetItem(i)->updateRightChild();
+}
+
+void ArchiveList::translateText()
+{
+    if (mMenu)
+        mMenu->translateText();
+    if (mFolderLabel && mCurrentPath.isEmpty())
+        mFolderLabel->setText(tr("Folder"));
+}

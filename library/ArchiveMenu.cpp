@@ -1,0 +1,42 @@
+#include "library/ArchiveMenu.h"
+
+ArchiveMenu::ArchiveMenu(QWidget* parent) : QMenu(parent)
+{
+    for (ArchiveAction::ARCHIVE_ACTION_TYPE type :
+         {ArchiveAction::ACTION_CREATE, ArchiveAction::ACTION_COPY, ArchiveAction::ACTION_PASTE,
+          ArchiveAction::ACTION_DELETE, ArchiveAction::ACTION_ADD_USER}) {
+        auto* entry = new ArchiveAction(QString(), type, this);
+        mActions.append(entry);
+        addAction(entry);
+    }
+    translateText();
+    connect(this, &QMenu::aboutToHide, this, &ArchiveMenu::signalMenuAboutToClose);
+}
+
+void ArchiveMenu::translateText()
+{
+    action(ArchiveAction::ACTION_CREATE)->setText(tr("Create New"));
+    action(ArchiveAction::ACTION_COPY)->setText(tr("Copy"));
+    action(ArchiveAction::ACTION_PASTE)->setText(tr("Paste"));
+    action(ArchiveAction::ACTION_DELETE)->setText(tr("Delete"));
+    action(ArchiveAction::ACTION_ADD_USER)->setText(tr("Save as Template"));
+}
+
+void ArchiveMenu::enableFor(bool onItem, bool hasCopy)
+{
+    action(ArchiveAction::ACTION_CREATE)->setEnabled(true);
+    action(ArchiveAction::ACTION_COPY)->setEnabled(onItem);
+    action(ArchiveAction::ACTION_PASTE)->setEnabled(hasCopy);
+    action(ArchiveAction::ACTION_DELETE)->setEnabled(onItem);
+    // There is no store of user templates yet.
+    action(ArchiveAction::ACTION_ADD_USER)->setEnabled(false);
+}
+
+ArchiveAction* ArchiveMenu::action(ArchiveAction::ARCHIVE_ACTION_TYPE type) const
+{
+    for (ArchiveAction* entry : mActions) {
+        if (entry->getActionType() == type)
+            return entry;
+    }
+    return nullptr;
+}

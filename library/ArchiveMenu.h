@@ -1,0 +1,29 @@
+// The option menu of the title list.
+#pragma once
+
+#include "library/ArchiveAction.h"
+
+#include <QList>
+#include <QMenu>
+
+class ArchiveMenu : public QMenu
+{
+    Q_OBJECT
+
+public:
+    explicit ArchiveMenu(QWidget* parent = nullptr);
+
+    // Sets the texts again after a change of language.
+    void translateText();
+
+    // onItem: the menu was opened on a title. hasCopy: there is something to paste.
+    void enableFor(bool onItem, bool hasCopy);
+
+    ArchiveAction* action(ArchiveAction::ARCHIVE_ACTION_TYPE type) const;
+
+signals:
+    void signalMenuAboutToClose();
+
+private:
+    QList<ArchiveAction*> mActions; // owned by this menu as their parent
+};

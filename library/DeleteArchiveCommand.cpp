@@ -1,0 +1,57 @@
+#include "library/DeleteArchiveCommand.h"
+
+#include "document/ArchiveOrder.h"
+#include "library/ArchiveItem.h"
+#include "library/ArchiveList.h"
+#include "library/TitleReports.h"
+
+DeleteArchiveCommand::DeleteArchiveCommand(ArchiveList* list, ArchiveItem* item, int position,
+                                           bool isSelected, QUndoCommand* parent)
+    : QUndoCommand(parent), mList(list), mItem(item), mPosition(position), mIsSelected(isSelected)
+{
+    mOrderBefore = getArchiveOrderList();
+}
+
+DeleteArchiveCommand::~DeleteArchiveCommand()
+{
+    qDeleteAll(mOrderAfter);
+    qDeleteAll(mOrderBefore);
+}
+
+void DeleteArchiveCommand::redo()
+{
+    if (!mItem)
+        return;
+    const QString path = mItem->getArchiveDataPath();
+    mItem->hide();
+    mList->removeWidgetItem(mItem);
+    mList->saveArchiveListOrder();
+    TitleReports::titleChanged(FileManagerDefine::TITLE_DELETED, path);
+    if (TitleReports::isNewInContext(path)) {
+        TitleReports::removeFromContext(path);
+        mIsNewInContext = true;
+    }
+    qDeleteAll(mOrderAfter);
+    mOrderAfter = getArchiveOrderList();
+    if (mIsSelected)
+        mList->selectArchive(qMin(mPosition, mList->count() - 1));
+}
+
+void DeleteArchiveCommand::undo()
+{
+    if (!mItem)
+        return;
+    const QString path = mItem->getArchiveDataPath();
+    mList->addWidgetItem(mItem, mPosition);
+    mList->saveArchiveListOrder();
+    if (mIsSelected)
+        mList->selectArchive(mPosition);
+    if (mIsNewInContext)
+        TitleReports::addToContext(path);
+    TitleReports::titleChanged(FileManagerDefine::TITLE_ADDED, path);
+}
+
+QList<ArchiveOrder*> DeleteArchiveCommand::getArchiveOrderList() const
+{
+    return mList->getArchiveOrderList();
+}

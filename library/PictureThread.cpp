@@ -1,0 +1,100 @@
+#include "library/PictureThread.h"
+
+#include "document/Archive.h"
+#include "document/ITitleChangeReporter.h"
+#include "document/ImageResizer.h"
+#include "document/PngWriter.h"
+#include "library/TitlerUtility.h"
+
+#include <QMutexLocker>
+#include <future>
+#include <string>
+
+const QSize PictureThread::THUMBNAIL_SMALL_SIZE(240, 135);
+const QSize PictureThread::THUMBNAIL_MIDDLE_SIZE(960, 540);
+
+namespace
+{
+
+// Empty for a name that is none or that leads out of the title's folder: a title file from elsewhere must not
+// choose which files of the appliance are overwritten.
+QString picturePath(const Archive& archive, const std::string& name)
+{
+    if (name.empty() || name.find('/') != std::string::npos)
+        return {};
+    return QString::fromStdString(TitlerUtility::getThumbnailPathFromTitlePath(archive.getPath(), name));
+}
+
+} // namespace
+
+PictureThread::PictureThread(QObject* parent) : QThread(parent)
+{
+    start(QThread::InheritPriority);
+}
+
+PictureThread::~PictureThread()
+{
+    {
+        QMutexLocker lock(&mMutex);
+        mUnfinished -= static_cast<int>(mJobs.size());
+        mJobs.clear();
+        mStop = true;
+        mCondition.wakeAll();
+    }
+    wait();
+}
+
+void PictureThread::addArchive(const Archive* archive, QList<QImage> images)
+{
+    if (!archive || images.size() < 2)
+        return;
+    Job job{std::make_unique<Archive>(*archive), images.at(0), images.at(1)};
+    QMutexLocker lock(&mMutex);
+    ++mUnfinished;
+    mJobs.push_back(std::move(job));
+    mCondition.wakeOne();
+}
+
+bool PictureThread::isThreadWaiting() const
+{
+    return mUnfinished == 0;
+}
+
+void PictureThread::run()
+{
+    for (;;) {
+        Job job;
+        {
+            QMutexLocker lock(&mMutex);
+            while (mJobs.empty() && !mStop)
+                mCondition.wait(&mMutex);
+            if (mStop)
+                return;
+            job = std::move(mJobs.front());
+            mJobs.pop_front();
+        }
+        saveArchiveThumnail(*job.archive, job.big, job.middle);
+        job = Job(); // the images go before the job counts as finished
+        --mUnfinished;
+    }
+}
+
+void PictureThread::saveArchiveThumnail(const Archive& archive, const QImage& big, const QImage& middle)
+{
+    const QString bigPath = picturePath(archive, archive.getThumbnailBig());
+    const QString middlePath = picturePath(archive, archive.getThumbnailMiddle());
+    const QString blackPath = picturePath(archive, archive.getThumbnailBlack());
+    const QString smallPath = picturePath(archive, archive.getThumbnailSmall());
+
+    // Four fifths of the work are in the big picture, which has a core of its own meanwhile. A picture that
+    // cannot be written is passed over: the others still help.
+    std::future<bool> bigSaved = std::async([&big, &bigPath] { return PngWriter::save(big, bigPath); });
+    PngWriter::save(middle, middlePath);
+    ImageResizer().resizeImageToThumbnail(middle, blackPath.toStdWString(), smallPath.toStdWString(),
+                                          static_cast<unsigned>(THUMBNAIL_SMALL_SIZE.width()),
+                                          static_cast<unsigned>(THUMBNAIL_SMALL_SIZE.height()));
+    bigSaved.wait();
+    if (ITitleChangeReporter* reporter = ITitleChangeReporter::instance())
+        reporter->changeTitlerStatus(FileManagerDefine::TITLE_PICTURES_CHANGED,
+                                     QString::fromStdString(archive.getPath()));
+}

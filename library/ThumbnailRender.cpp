@@ -1,0 +1,197 @@
+#include "library/ThumbnailRender.h"
+
+#include "canvas/GraphicsPixmap.h"
+#include "canvas/GraphicsText.h"
+#include "document/Archive.h"
+#include "document/TText.h"
+#include "library/TitlerUtility.h"
+
+#include <QFile>
+#include <QGraphicsDropShadowEffect>
+#include <QPainter>
+#include <QPixmap>
+#include <QPoint>
+
+const QSize ThumbnailRender::THUMBNAIL_BIG_SIZE(1920, 1080);
+const QSize ThumbnailRender::THUMBNAIL_MID_SIZE(1280, 720);
+const QSize ThumbnailRender::THUMBNAIL_MIDDLE_SIZE(960, 540);
+const QSize ThumbnailRender::THUMBNAIL_SMALL_SIZE(240, 135);
+const QSize ThumbnailRender::THUMBNAIL_BLACK_SIZE(240, 135);
+const QRect ThumbnailRender::SCENE_RECT_SIZE(QPoint(0, 0), QPoint(1279, 719));
+const QRect ThumbnailRender::BIG_SIZE_SCENE_RECT_SIZE(QPoint(0, 0), QPoint(1919, 1079));
+const QColor ThumbnailRender::DROP_SHADOW_COLOR(0, 0, 0, 255);
+
+namespace
+{
+
+// From positions on the 1280 canvas to the 1920 raster: by way of the 3840 one and back by half.
+const double TO_DOUBLE_RASTER = 3.0;
+const double TO_RASTER = 0.5;
+const double CANVAS_RATIO = 2.0 / 3.0;
+const double RASTER_RATIO = 1.0;
+
+// Frames are cut to the raster, so that a text far outside costs nothing to paint.
+void limitTextsToRaster(const QGraphicsScene& scene)
+{
+    for (QGraphicsItem* item : scene.items()) {
+        if (item->type() == GraphicsText::Type)
+            static_cast<GraphicsText*>(item)->setBoundingRectFlag(true);
+    }
+}
+
+QImage renderScene(QGraphicsScene& scene, QSize size)
+{
+    QImage image(size, QImage::Format_ARGB32_Premultiplied);
+    image.fill(Qt::transparent);
+    QPainter painter(&image);
+    painter.setRenderHint(QPainter::Antialiasing);
+    scene.render(&painter, QRectF(), QRectF(), Qt::KeepAspectRatio);
+    return image;
+}
+
+} // namespace
+
+ThumbnailRender::ThumbnailRender(QObject* parent) : IThumbnailRender(parent)
+{
+    mMiddleScene.setSceneRect(SCENE_RECT_SIZE);
+    mBigScene.setSceneRect(BIG_SIZE_SCENE_RECT_SIZE);
+    // Filled, rendered once and emptied: an index would never pay.
+    mMiddleScene.setItemIndexMethod(QGraphicsScene::NoIndex);
+    mBigScene.setItemIndexMethod(QGraphicsScene::NoIndex);
+}
+
+ThumbnailRender::~ThumbnailRender()
+{
+    clearMiddleSizeCanvasScene();
+    clearBigSizeCanvasScene();
+}
+
+void ThumbnailRender::makeThumbnail(const Archive* archive, bool bigSize)
+{
+    if (!archive)
+        return;
+    if (bigSize)
+        makeBigSizeThumbnail(*archive);
+    else
+        makeMiddleAndSmallSizeThumbnail(*archive);
+}
+
+bool ThumbnailRender::makePictureThreadIsFinished()
+{
+    return mPictureThread.isThreadWaiting();
+}
+
+void ThumbnailRender::makeMiddleAndSmallSizeThumbnail(const Archive& archive)
+{
+    createMiddleSizeCanvasSceneUsingArchiveData(archive);
+    saveMiddleSizeThumnail(archive, renderMiddleSizeCanvasScene());
+    clearMiddleSizeCanvasScene();
+}
+
+void ThumbnailRender::createMiddleSizeCanvasSceneUsingArchiveData(const Archive& archive)
+{
+    const QString background = archive.getFullPathOfBgResource();
+    if (!background.isEmpty()) {
+        mMiddleBackground = new GraphicsPixmap(background);
+        const QPixmap pixmap = mMiddleBackground->pixmap();
+        if (!pixmap.isNull())
+            mMiddleBackground->setPixmap(
+                pixmap.scaled(THUMBNAIL_MID_SIZE, Qt::IgnoreAspectRatio, Qt::SmoothTransformation));
+        mMiddleScene.addItem(mMiddleBackground);
+        mMiddleBackground->setPos(archive.getBgPointX(), archive.getBgPointY());
+        mMiddleBackground->setZValue(archive.getBgPointZ());
+    }
+    for (TText* record : archive.text()) {
+        auto* text = new GraphicsText(record, record->getTextObjectID());
+        text->setRadio(CANVAS_RATIO, false);
+        text->setPos(record->getXValue(), record->getYValue());
+        text->setZValue(record->getZValue());
+        text->initShowText();
+        if (auto* shadow = qobject_cast<QGraphicsDropShadowEffect*>(text->graphicsEffect()))
+            shadow->setColor(DROP_SHADOW_COLOR);
+        mTexts.append(text);
+        mMiddleScene.addItem(text);
+    }
+    limitTextsToRaster(mMiddleScene);
+}
+
+QImage ThumbnailRender::renderMiddleSizeCanvasScene()
+{
+    return renderScene(mMiddleScene, THUMBNAIL_MID_SIZE);
+}
+
+void ThumbnailRender::saveMiddleSizeThumnail(const Archive& archive, const QImage& image)
+{
+    emit saveHalfThumbnailsOK(
+        QString::fromStdString(archive.getPath()),
+        image.scaled(THUMBNAIL_SMALL_SIZE, Qt::IgnoreAspectRatio, Qt::SmoothTransformation));
+}
+
+void ThumbnailRender::clearMiddleSizeCanvasScene()
+{
+    mTexts.clear();
+    mMiddleScene.clear();
+    mMiddleBackground = nullptr;
+    clearMiddleSizeCanvasSceneResource();
+}
+
+void ThumbnailRender::makeBigSizeThumbnail(const Archive& archive)
+{
+    deleteOldFile(archive);
+    createBigSizeCanvasSceneUsingArchiveData(archive);
+    saveBigSizeThumnail(archive, renderBigAndMiddleSizeCanvasScene());
+    clearBigSizeCanvasScene();
+}
+
+void ThumbnailRender::deleteOldFile(const Archive& archive)
+{
+    QFile file(QString::fromStdString(
+        TitlerUtility::getThumbnailPathFromTitlePath(archive.getPath(), archive.getThumbnailBig())));
+    if (!archive.getThumbnailBig().empty() && file.exists() && !file.isOpen())
+        file.remove();
+}
+
+void ThumbnailRender::createBigSizeCanvasSceneUsingArchiveData(const Archive& archive)
+{
+    mBigBackground = new GraphicsPixmap(archive.getFullPathOfBgResourceBig());
+    mBigScene.addItem(mBigBackground);
+    mBigBackground->setPos(0, 0);
+    mBigBackground->setZValue(archive.getBgPointZ());
+    for (TText* record : archive.text()) {
+        auto* text = new GraphicsText(record, record->getTextObjectID());
+        text->setRadio(RASTER_RATIO, true);
+        text->setPos(record->getXValue() * TO_DOUBLE_RASTER * TO_RASTER,
+                     record->getYValue() * TO_DOUBLE_RASTER * TO_RASTER);
+        text->setZValue(record->getZValue());
+        text->initShowText();
+        mBigScene.addItem(text);
+    }
+    limitTextsToRaster(mBigScene);
+}
+
+QList<QImage> ThumbnailRender::renderBigAndMiddleSizeCanvasScene()
+{
+    const QImage big = renderScene(mBigScene, THUMBNAIL_BIG_SIZE);
+    const QImage middle = big.scaled(THUMBNAIL_MIDDLE_SIZE, Qt::IgnoreAspectRatio, Qt::SmoothTransformation);
+    return {big, middle};
+}
+
+void ThumbnailRender::saveBigSizeThumnail(const Archive& archive, const QList<QImage>& images)
+{
+    mPictureThread.addArchive(&archive, images);
+}
+
+void ThumbnailRender::clearBigSizeCanvasScene()
+{
+    mBigScene.clear();
+    mBigBackground = nullptr;
+    clearBigSizeCanvasSceneResource();
+}
+
+void ThumbnailRender::clearBigSizeCanvasSceneResource()
+{
+}
+
+void ThumbnailRender::clearMiddleSizeCanvasSceneResource()
+{
+}

@@ -1,0 +1,144 @@
+#include "library/TitleFileOperations.h"
+
+#include "document/Archive.h"
+#include "document/ArchiveController.h"
+#include "library/TitlerUtility.h"
+#include "support/AtomicFile.h"
+#include "support/LogManager.h"
+
+#include <QDir>
+#include <QFile>
+#include <QFileInfo>
+
+const QString TitleFileOperations::TIME_FORMATE = QStringLiteral("yyyyMMddhhmmsszzz");
+const QString TitleFileOperations::THUMBNAIL_BIG = QStringLiteral("_1920.png");
+const QString TitleFileOperations::THUMBNAIL_MIDDLE = QStringLiteral("_960.png");
+const QString TitleFileOperations::THUMBNAIL_SMALL = QStringLiteral("_240.png");
+const QString TitleFileOperations::THUMBNAIL_BLACK = QStringLiteral("_240S.png");
+const QString TitleFileOperations::THUMBNAIL_SOURCE = QStringLiteral("_240");
+const QString TitleFileOperations::BG_SOURCE = QStringLiteral("_source_1280");
+const QString TitleFileOperations::BG_SOURCE_BIG = QStringLiteral("_source_1920");
+const QString TitleFileOperations::XML_EXTENSION = QStringLiteral(".xml");
+
+namespace
+{
+
+// No picture of a title comes near this; what is larger is not one of ours.
+constexpr std::size_t PICTURE_LIMIT = 64 * 1024 * 1024;
+
+QByteArray readPicture(const QString& path)
+{
+    std::string bytes;
+    if (path.isEmpty() || !AtomicFile::read(path.toStdString(), PICTURE_LIMIT, bytes))
+        return {};
+    return QByteArray::fromStdString(bytes);
+}
+
+QString pictureOf(const Archive& archive, const std::string& name)
+{
+    if (name.empty())
+        return {};
+    return QString::fromStdString(TitlerUtility::getThumbnailPathFromTitlePath(archive.getPath(), name));
+}
+
+void writePicture(const Archive& archive, const std::string& name, const QByteArray& bytes)
+{
+    if (!name.empty() && !bytes.isEmpty())
+        AtomicFile::write(pictureOf(archive, name).toStdString(),
+                          {bytes.constData(), static_cast<std::size_t>(bytes.size())});
+}
+
+// From the last "." on; empty when there is none.
+QString extensionOf(const std::string& fileName)
+{
+    const QString name = QString::fromStdString(fileName);
+    const qsizetype dot = name.lastIndexOf(QLatin1Char('.'));
+    return dot < 0 || dot < name.lastIndexOf(QLatin1Char('/')) ? QString() : name.mid(dot);
+}
+
+} // namespace
+
+TitleFileOperations::TitleFileOperations(ArchiveController& controller) : mController(controller)
+{
+}
+
+QString TitleFileOperations::freeStem(const QString& folder, const QDateTime& now)
+{
+    QDateTime moment = now;
+    QString stem = moment.toString(TIME_FORMATE);
+    while (QFile::exists(folder + QLatin1Char('/') + stem + XML_EXTENSION)) {
+        moment = moment.addMSecs(1);
+        stem = moment.toString(TIME_FORMATE);
+    }
+    return stem;
+}
+
+void TitleFileOperations::renameRecord(Archive& archive, const QString& folder) const
+{
+    const QString stem = freeStem(folder);
+    const QString extension = extensionOf(archive.getThumbnailSmall());
+
+    archive.setName(stem.toStdString());
+    archive.setPath((folder + QLatin1Char('/') + stem + XML_EXTENSION).toStdString());
+    archive.setThumbnailBig((stem + THUMBNAIL_BIG).toStdString());
+    archive.setThumbnailSmall((stem + THUMBNAIL_SMALL).toStdString());
+    archive.setThumbnailMiddle((stem + THUMBNAIL_MIDDLE).toStdString());
+    archive.setThumbnailBlack((stem + THUMBNAIL_BLACK).toStdString());
+    if (archive.isPreset())
+        return;
+    if (extension.isEmpty()) {
+        LOG_EVENT(L"ArchiveList", __LINE__, L"small thumbnail without an extension", 4);
+        return;
+    }
+    archive.setThumbnailSmall((stem + THUMBNAIL_SOURCE + extension).toStdString());
+    if (!archive.getBgResource().empty())
+        archive.setBgResource((stem + BG_SOURCE + extension).toStdString());
+    if (!archive.getBgResourceBig().empty())
+        archive.setBgResourceBig((stem + BG_SOURCE_BIG + extension).toStdString());
+}
+
+std::unique_ptr<Archive> TitleFileOperations::createFromTemplate(const QString& folder,
+                                                                 const Archive& source) const
+{
+    if (folder.isEmpty())
+        return nullptr;
+    auto archive = std::make_unique<Archive>(source);
+    renameRecord(*archive, folder);
+    Archive from(source);
+    mController.copyArchiveThumbnail(&from, archive.get());
+    if (!archive->isPreset())
+        mController.copyArchiveBg(&from, archive.get());
+    if (!mController.saveNewArchive(folder, archive.get()))
+        return nullptr;
+    return archive;
+}
+
+TitlePictures TitleFileOperations::loadPictures(const Archive& archive)
+{
+    TitlePictures pictures;
+    pictures.big = readPicture(pictureOf(archive, archive.getThumbnailBig()));
+    pictures.middle = readPicture(pictureOf(archive, archive.getThumbnailMiddle()));
+    pictures.black = readPicture(pictureOf(archive, archive.getThumbnailBlack()));
+    pictures.small = readPicture(archive.getFullPathOfThumbnailSmall());
+    return pictures;
+}
+
+std::unique_ptr<Archive> TitleFileOperations::createFromCopy(const QString& folder, const Archive& copy,
+                                                             const TitlePictures& pictures) const
+{
+    if (folder.isEmpty())
+        return nullptr;
+    auto archive = std::make_unique<Archive>(copy);
+    renameRecord(*archive, folder);
+    writePicture(*archive, archive->getThumbnailBig(), pictures.big);
+    writePicture(*archive, archive->getThumbnailSmall(), pictures.small);
+    writePicture(*archive, archive->getThumbnailMiddle(), pictures.middle);
+    writePicture(*archive, archive->getThumbnailBlack(), pictures.black);
+    if (!archive->isPreset()) {
+        Archive from(copy);
+        mController.copyArchiveBg(&from, archive.get());
+    }
+    if (!mController.saveNewArchive(folder, archive.get()))
+        return nullptr;
+    return archive;
+}

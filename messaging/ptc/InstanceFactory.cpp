@@ -1,0 +1,53 @@
+#include "messaging/ptc/InstanceFactory.h"
+
+#include "messaging/ptc/IRemoteReceiver.h"
+#include "messaging/ptc/ISender.h"
+
+namespace PTC
+{
+
+InstanceFactory::InstanceFactory() = default;
+
+InstanceFactory::~InstanceFactory()
+{
+    // Ends the threads before anything that a call could still use goes.
+    m_remoteReceiver.reset();
+}
+
+bool InstanceFactory::initialize()
+{
+    return true;
+}
+
+long InstanceFactory::getRRIdentity()
+{
+    return m_remoteReceiver != nullptr ? m_remoteReceiver->getIdentity() : -1;
+}
+
+ISender* InstanceFactory::findSender(long key)
+{
+    const auto found = m_senders.find(key);
+    return found != m_senders.end() ? found->second.get() : nullptr;
+}
+
+void InstanceFactory::addSender(ISender* sender)
+{
+    std::unique_ptr<ISender> owner(sender);
+    std::unique_ptr<ISender>& entry = m_senders[sender->getId()];
+    if (entry == nullptr || entry.get() == sender) {
+        static_cast<void>(entry.release());
+        entry = std::move(owner);
+    }
+}
+
+void InstanceFactory::setRemoteReceiver(IRemoteReceiver* receiver)
+{
+    m_remoteReceiver.reset(receiver);
+}
+
+IRemoteReceiver* InstanceFactory::remoteReceiver()
+{
+    return m_remoteReceiver.get();
+}
+
+} // namespace PTC

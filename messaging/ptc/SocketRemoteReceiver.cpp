@@ -1,0 +1,286 @@
+#include "messaging/ptc/SocketRemoteReceiver.h"
+
+#include "messaging/ptc/EventPacket.h"
+#include "messaging/ptc/SocketFrame.h"
+
+#include <netinet/in.h>
+#include <netinet/tcp.h>
+#include <signal.h>
+#include <sys/socket.h>
+#include <unistd.h>
+
+#include <cerrno>
+#include <cstdint>
+#include <cstdio>
+#include <cstring>
+#include <new>
+
+namespace
+{
+
+const int LISTEN_BACKLOG = 10;
+const boost::posix_time::milliseconds ACCEPT_PAUSE(500);
+
+void printLine(const char* text)
+{
+    std::puts(text);
+    std::fflush(stdout);
+}
+
+// Signals are for the main thread; here they would only cut system calls short. Faults stay with the thread.
+void leaveSignalsToMainThread()
+{
+    sigset_t signals;
+    sigfillset(&signals);
+    for (const int fault : {SIGSEGV, SIGBUS, SIGFPE, SIGILL, SIGABRT}) {
+        sigdelset(&signals, fault);
+    }
+    pthread_sigmask(SIG_BLOCK, &signals, nullptr);
+}
+
+long readLong(const char* frame, long offset)
+{
+    std::int64_t value = 0;
+    std::memcpy(&value, frame + offset, sizeof value);
+    return value;
+}
+
+} // namespace
+
+struct SocketRemoteReceiver::ClientStart {
+    SocketRemoteReceiver* receiver;
+    int socket;
+    std::shared_ptr<std::atomic<bool>> finished;
+};
+
+SocketRemoteReceiver::SocketRemoteReceiver(long id) : PTC::RemoteReceiver(id)
+{
+}
+
+SocketRemoteReceiver::~SocketRemoteReceiver()
+{
+    m_stopping = true;
+    stopReceivers();
+    const int listenSocket = m_listenSocket.exchange(-1);
+    if (listenSocket != -1) {
+        shutdown(listenSocket, SHUT_RDWR); // wakes the accept
+    }
+    if (m_acceptThread != nullptr) {
+        m_acceptThread->interrupt();
+        m_acceptThread->join();
+    }
+    for (const int socket : m_clientSockets) {
+        shutdown(socket, SHUT_RDWR);
+    }
+    for (const ClientThread& client : m_clientThreads) {
+        client.thread->join();
+    }
+    for (const int socket : m_clientSockets) {
+        close(socket);
+    }
+    if (listenSocket != -1) {
+        close(listenSocket);
+    }
+}
+
+bool SocketRemoteReceiver::initialize(long identity)
+{
+    if (m_listenSocket != -1) {
+        return false;
+    }
+    PTC::RemoteReceiver::initialize(identity);
+    if (!prepareListeningSocket()) {
+        return false;
+    }
+    try {
+        m_acceptThread = std::make_unique<boost::thread>(&SocketRemoteReceiver::connectListeners, this);
+    } catch (const boost::thread_resource_error&) {
+        return failStart("[Error]create socket server listenner failed!");
+    }
+    return true;
+}
+
+bool SocketRemoteReceiver::prepareListeningSocket()
+{
+    m_listenSocket = socket(AF_INET, SOCK_STREAM | SOCK_CLOEXEC, IPPROTO_TCP);
+    if (m_listenSocket == -1) {
+        printLine("[Error]Socket Server create failed!");
+        return false;
+    }
+    const int on = 1;
+    if (setsockopt(m_listenSocket, SOL_SOCKET, SO_REUSEADDR, &on, sizeof on) != 0) {
+        return failStart("[Error]Socket Server reuse address failed!");
+    }
+    const int bufferSize = SocketFrame::RECEIVE_BUFFER_SIZE;
+    if (setsockopt(m_listenSocket, SOL_SOCKET, SO_RCVBUF, &bufferSize, sizeof bufferSize) != 0) {
+        return failStart("[Error]Socket Server set Rec buffer failed!");
+    }
+    sockaddr_in address{};
+    address.sin_family = AF_INET;
+    address.sin_addr.s_addr = htonl(INADDR_LOOPBACK);
+    address.sin_port = htons(SocketFrame::portOf(getIdentity()));
+    if (address.sin_port == 0 ||
+        ::bind(m_listenSocket, reinterpret_cast<sockaddr*>(&address), sizeof address) != 0) {
+        return failStart("[Error]Socket Server create failed!");
+    }
+    if (listen(m_listenSocket, LISTEN_BACKLOG) != 0) {
+        return failStart("[Error]create socket server listenner failed!");
+    }
+    return true;
+}
+
+bool SocketRemoteReceiver::failStart(const char* message)
+{
+    printLine(message);
+    close(m_listenSocket.exchange(-1));
+    return false;
+}
+
+void SocketRemoteReceiver::run()
+{
+}
+
+void SocketRemoteReceiver::connectListeners(void* receiver)
+{
+    leaveSignalsToMainThread();
+    try {
+        static_cast<SocketRemoteReceiver*>(receiver)->waitClientLink();
+    } catch (const boost::thread_interrupted&) {
+        return; // the receiver ends
+    }
+}
+
+void SocketRemoteReceiver::waitClientLink()
+{
+    const int listenSocket = m_listenSocket;
+    while (!m_stopping) {
+        const int client = accept4(listenSocket, nullptr, nullptr, SOCK_CLOEXEC);
+        if (m_stopping) {
+            if (client != -1) {
+                close(client);
+            }
+            return;
+        }
+        if (client == -1) {
+            printLine("[Error]bad client!");
+            if (errno != ECONNABORTED && errno != EINTR) {
+                // Out of descriptors or memory: the pending connection stays, and trying at once would only
+                // spin.
+                boost::this_thread::sleep(ACCEPT_PAUSE);
+            }
+            continue;
+        }
+        addClientThread(client);
+        boost::this_thread::sleep(ACCEPT_PAUSE);
+    }
+}
+
+void SocketRemoteReceiver::addClientThread(int socket)
+{
+    const int on = 1;
+    setsockopt(socket, IPPROTO_TCP, TCP_NODELAY, &on, sizeof on);
+    joinFinishedThreads();
+    m_lastClientSocket = socket;
+    m_clientSockets.push_back(socket);
+    auto finished = std::make_shared<std::atomic<bool>>(false);
+    auto start = std::make_unique<ClientStart>(ClientStart{this, socket, finished});
+    try {
+        auto thread = std::make_unique<boost::thread>(&SocketRemoteReceiver::ThreadEntry, start.get());
+        static_cast<void>(start.release()); // the thread deletes it
+        m_clientThreads.push_back({std::move(thread), std::move(finished)});
+    } catch (const boost::thread_resource_error&) {
+        printLine("[Error]bad client!");
+        m_clientSockets.pop_back();
+        close(socket);
+    }
+}
+
+void SocketRemoteReceiver::joinFinishedThreads()
+{
+    std::erase_if(m_clientThreads, [](const ClientThread& client) {
+        if (!*client.finished) {
+            return false;
+        }
+        client.thread->join();
+        return true;
+    });
+}
+
+void SocketRemoteReceiver::ThreadEntry(void* start)
+{
+    leaveSignalsToMainThread();
+    const std::unique_ptr<ClientStart> client(static_cast<ClientStart*>(start));
+    client->receiver->ThreadMain(client->socket);
+    *client->finished = true;
+}
+
+int SocketRemoteReceiver::ThreadMain(int socket)
+{
+    const std::unique_ptr<char[]> buffer(new (std::nothrow) char[SocketFrame::FRAME_SIZE]());
+    if (buffer == nullptr) {
+        return -1;
+    }
+    long got = 0;
+    long want = SocketFrame::FRAME_SIZE;
+    while (true) {
+        const int received =
+            static_cast<int>(recv(socket, buffer.get() + got, static_cast<std::size_t>(want), 0));
+        if (received == -1 && errno == EINTR) {
+            continue;
+        }
+        if (isRecvDataFailed(received)) {
+            return 0;
+        }
+        if (!sendACK(socket)) {
+            want = SocketFrame::FRAME_SIZE - got; // what was just read is read over
+            continue;
+        }
+        got += received;
+        if (got < SocketFrame::FRAME_SIZE) {
+            want = SocketFrame::FRAME_SIZE - got;
+            continue;
+        }
+        got = 0;
+        want = SocketFrame::FRAME_SIZE;
+        executePacket(buffer.get());
+    }
+}
+
+void SocketRemoteReceiver::executePacket(char* frame)
+{
+    PTC::EventPacket packet;
+    packet.receiverId = readLong(frame, SocketFrame::RECEIVER_ID);
+    packet.objectId = readLong(frame, SocketFrame::OBJECT_ID);
+    packet.methodId = readLong(frame, SocketFrame::METHOD_ID);
+    packet.callback = frame[SocketFrame::IS_CALLBACK] != 0;
+    packet.size = readLong(frame, SocketFrame::SIZE);
+    packet.remote = frame[SocketFrame::IS_REMOTE] != 0;
+    if (packet.size <= 0 || packet.size > SocketFrame::MAX_PAYLOAD) {
+        return;
+    }
+    const auto size = static_cast<std::size_t>(packet.size);
+    char* data = new char[size];
+    std::memcpy(data, frame + SocketFrame::HEADER_SIZE, size);
+    packet.data = data;
+    handleEventPacket(&packet);
+}
+
+bool SocketRemoteReceiver::sendACK(int socket)
+{
+    ssize_t sent = 0;
+    do {
+        sent = ::send(socket, SocketFrame::ACKNOWLEDGEMENT.data(), SocketFrame::ACKNOWLEDGEMENT.size(),
+                      MSG_NOSIGNAL);
+    } while (sent == -1 && errno == EINTR);
+    return sent != 0 && sent != -1;
+}
+
+bool SocketRemoteReceiver::isRecvDataFailed(int received)
+{
+    return received == -1 || received == 0;
+}
+
+int SocketRemoteReceiver::getLastClientSocket() const
+{
+    return m_lastClientSocket;
+}

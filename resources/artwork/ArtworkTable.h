@@ -1,0 +1,6 @@
+#pragma once
+
+#include "resources/artwork/Picture.h"
+
+// Every picture of the program.
+QList<Picture> artworkTable();

@@ -1,0 +1,46 @@
+#include "resources/artwork/Picture.h"
+
+#include <QPainter>
+#include <QStringList>
+
+namespace
+{
+
+constexpr int MIDDLE = 8; // length of the stretched pieces
+
+Picture cut(const QString& collection, const QString& name, const QRect& part, const QSize& whole,
+            const std::function<void(QPainter&, const QSize&)>& drawWhole)
+{
+    return {collection, name, part.size(), [part, whole, drawWhole](QPainter& painter) {
+                painter.translate(-part.topLeft());
+                drawWhole(painter, whole);
+            }};
+}
+
+} // namespace
+
+void addNineSlice(QList<Picture>& table, const QString& collection, const QString& prefix,
+                  const QStringList& names, const QSize& corner,
+                  const std::function<void(QPainter&, const QSize&)>& drawWhole)
+{
+    const QSize whole(2 * corner.width() + MIDDLE, 2 * corner.height() + MIDDLE);
+    const int xs[] = {0, corner.width(), corner.width() + MIDDLE};
+    const int ys[] = {0, corner.height(), corner.height() + MIDDLE};
+    const int widths[] = {corner.width(), MIDDLE, corner.width()};
+    const int heights[] = {corner.height(), MIDDLE, corner.height()};
+    for (int row = 0; row < 3; ++row) {
+        for (int column = 0; column < 3; ++column) {
+            const QRect part(xs[column], ys[row], widths[column], heights[row]);
+            table.append(cut(collection, prefix + names.at(row * 3 + column), part, whole, drawWhole));
+        }
+    }
+}
+
+void addThreeSlice(QList<Picture>& table, const QString& collection, const QStringList& names, int height,
+                   int cap, const std::function<void(QPainter&, const QSize&)>& drawWhole)
+{
+    const QSize whole(2 * cap + MIDDLE, height);
+    table.append(cut(collection, names.at(0), QRect(0, 0, cap, height), whole, drawWhole));
+    table.append(cut(collection, names.at(1), QRect(cap, 0, MIDDLE, height), whole, drawWhole));
+    table.append(cut(collection, names.at(2), QRect(cap + MIDDLE, 0, cap, height), whole, drawWhole));
+}

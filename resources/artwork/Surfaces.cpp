@@ -1,0 +1,154 @@
+#include "resources/artwork/Surfaces.h"
+
+#include "resources/artwork/DesignTokens.h"
+
+#include <QLinearGradient>
+#include <QPainter>
+#include <QPainterPath>
+
+namespace
+{
+
+struct Face {
+    QColor top;
+    QColor bottom;
+    QColor outline;
+    QColor highlight; // inside the upper edge
+};
+
+QRectF insideLine(const QSize& size, qreal inset)
+{
+    return QRectF(inset, inset, size.width() - 2 * inset, size.height() - 2 * inset);
+}
+
+Face faceOf(Surfaces::Button state)
+{
+    using Surfaces::Button;
+    switch (state) {
+    case Button::Rest:
+        return {Tokens::FACE_TOP, Tokens::FACE_BOTTOM, Tokens::OUTLINE, QColor(116, 116, 116)};
+    case Button::Pressed:
+        return {Tokens::FACE_PRESSED_TOP, Tokens::FACE_PRESSED_BOTTOM, Tokens::OUTLINE, QColor(14, 14, 14)};
+    case Button::Disabled:
+        return {Tokens::FACE_DISABLED, Tokens::FACE_DISABLED, QColor(30, 30, 30), Tokens::FACE_DISABLED};
+    case Button::SelectedRest:
+        return {Tokens::SELECTED_TOP, Tokens::SELECTED_BOTTOM, Tokens::ACCENT, QColor(98, 128, 214)};
+    case Button::SelectedPressed:
+        return {Tokens::SELECTED_PRESSED_TOP, Tokens::SELECTED_PRESSED_BOTTOM, Tokens::ACCENT,
+                QColor(10, 26, 84)};
+    case Button::SelectedDisabled:
+        return {Tokens::SELECTED_DISABLED, Tokens::SELECTED_DISABLED, QColor(24, 30, 48),
+                Tokens::SELECTED_DISABLED};
+    }
+    return {};
+}
+
+void drawFace(QPainter& painter, const QSize& size, const Face& face, qreal radius)
+{
+    painter.setRenderHint(QPainter::Antialiasing);
+    QLinearGradient gradient(0, 0, 0, size.height());
+    gradient.setColorAt(0, face.top);
+    gradient.setColorAt(1, face.bottom);
+    painter.setPen(QPen(face.outline, Tokens::BORDER));
+    painter.setBrush(gradient);
+    painter.drawRoundedRect(insideLine(size, Tokens::BORDER / 2), radius, radius);
+    painter.setPen(QPen(face.highlight, Tokens::BORDER));
+    painter.drawLine(QPointF(radius, 1.5), QPointF(size.width() - radius, 1.5));
+}
+
+} // namespace
+
+void Surfaces::button(QPainter& painter, const QSize& size, Button state)
+{
+    drawFace(painter, size, faceOf(state), Tokens::RADIUS_BUTTON);
+}
+
+void Surfaces::toolPlate(QPainter& painter, const QSize& size, Button state)
+{
+    drawFace(painter, size, faceOf(state), Tokens::RADIUS_PANE);
+}
+
+void Surfaces::pane(QPainter& painter, const QSize& size, const QColor& fill)
+{
+    drawFace(painter, size, {fill, fill, Tokens::EDGE_DARK, Tokens::EDGE_LIGHT}, Tokens::RADIUS_PANE);
+}
+
+void Surfaces::dialog(QPainter& painter, const QSize& size)
+{
+    // Outline, a light rim inside it, the face: a dialog stands out from the pane behind it.
+    painter.setRenderHint(QPainter::Antialiasing);
+    painter.setPen(Qt::NoPen);
+    painter.setBrush(Tokens::OUTLINE);
+    painter.drawRoundedRect(insideLine(size, 0), Tokens::RADIUS_PANE + 2, Tokens::RADIUS_PANE + 2);
+    painter.setBrush(Tokens::EDGE_LIGHT);
+    painter.drawRoundedRect(insideLine(size, 2), Tokens::RADIUS_PANE, Tokens::RADIUS_PANE);
+    painter.setBrush(Tokens::DIALOG);
+    painter.drawRoundedRect(insideLine(size, 3), Tokens::RADIUS_PANE - 1, Tokens::RADIUS_PANE - 1);
+}
+
+void Surfaces::selectionBar(QPainter& painter, const QSize& size)
+{
+    QLinearGradient gradient(0, 0, 0, size.height());
+    gradient.setColorAt(0, Tokens::TITLE_SELECTION_TOP);
+    gradient.setColorAt(1, Tokens::TITLE_SELECTION_BOTTOM);
+    painter.fillRect(QRect(QPoint(0, 0), size), gradient);
+}
+
+void Surfaces::horizontalGroove(QPainter& painter, const QSize& size)
+{
+    const int half = size.height() / 2;
+    painter.fillRect(0, 0, size.width(), half, Tokens::EDGE_DARK);
+    painter.fillRect(0, half, size.width(), size.height() - half, QColor(72, 72, 72));
+}
+
+void Surfaces::verticalGroove(QPainter& painter, const QSize& size)
+{
+    const int half = size.width() / 2;
+    painter.fillRect(0, 0, half, size.height(), Tokens::EDGE_DARK);
+    painter.fillRect(half, 0, size.width() - half, size.height(), QColor(72, 72, 72));
+}
+
+void Surfaces::checker(QPainter& painter, const QRect& area, int cell)
+{
+    painter.save();
+    painter.setClipRect(area);
+    painter.fillRect(area, Tokens::CHECKER_LIGHT);
+    for (int y = area.top(), row = 0; y <= area.bottom(); y += cell, ++row) {
+        for (int x = area.left() + (row % 2) * cell; x <= area.right(); x += 2 * cell) {
+            painter.fillRect(x, y, cell, cell, Tokens::CHECKER_DARK);
+        }
+    }
+    painter.restore();
+}
+
+void Surfaces::canvasFrame(QPainter& painter, const QRect& canvas)
+{
+    painter.setRenderHint(QPainter::Antialiasing);
+    painter.setPen(Qt::NoPen);
+    painter.setBrush(QColor(72, 72, 72));
+    painter.drawRoundedRect(QRectF(canvas.adjusted(-8, -8, 8, 8)), Tokens::RADIUS_PANE, Tokens::RADIUS_PANE);
+    painter.setBrush(Tokens::EDGE_DARK);
+    painter.drawRoundedRect(QRectF(canvas.adjusted(-7, -7, 7, 7)), Tokens::RADIUS_PANE - 1,
+                            Tokens::RADIUS_PANE - 1);
+    painter.setRenderHint(QPainter::Antialiasing, false);
+    painter.fillRect(canvas.adjusted(-1, -1, 1, 1), Qt::black);
+    checker(painter, canvas, Tokens::CHECKER_CELL);
+}
+
+void Surfaces::caretHandle(QPainter& painter, const QSize& size, bool pressed)
+{
+    painter.setRenderHint(QPainter::Antialiasing);
+    const qreal middle = size.width() / 2.0;
+    const qreal radius = middle - 2.0;
+    const QRectF circle(2.0, size.height() - 2.0 - 2 * radius, 2 * radius, 2 * radius);
+    QPainterPath drop;
+    drop.moveTo(middle, 0.5);
+    drop.lineTo(middle + radius * 0.72, circle.top() + radius * 0.42);
+    drop.lineTo(middle - radius * 0.72, circle.top() + radius * 0.42);
+    drop.closeSubpath();
+    QPainterPath round;
+    round.addEllipse(circle);
+    painter.setPen(QPen(pressed ? QColor(Qt::white) : Tokens::TEXT, pressed ? 2.0 : 1.0));
+    painter.setBrush(pressed ? QColor(90, 178, 255) : Tokens::ACCENT);
+    painter.drawPath(drop.united(round));
+}

@@ -1,0 +1,30 @@
+#pragma once
+
+#include <QColor>
+#include <QRect>
+#include <QSize>
+
+class QPainter;
+
+// Faces of buttons, panes and rulers, painted from the origin over the given size.
+namespace Surfaces
+{
+
+enum class Button { Rest, Pressed, Disabled, SelectedRest, SelectedPressed, SelectedDisabled };
+
+void button(QPainter& painter, const QSize& size, Button state);
+// The plate behind a button of the tools bar, which has none at rest.
+void toolPlate(QPainter& painter, const QSize& size, Button state);
+void pane(QPainter& painter, const QSize& size, const QColor& fill);
+void dialog(QPainter& painter, const QSize& size);
+void selectionBar(QPainter& painter, const QSize& size);
+// A groove of two lines, dark above light for a horizontal one.
+void horizontalGroove(QPainter& painter, const QSize& size);
+void verticalGroove(QPainter& painter, const QSize& size);
+void checker(QPainter& painter, const QRect& area, int cell);
+// The canvas frame of the window; the canvas lies at the given rectangle.
+void canvasFrame(QPainter& painter, const QRect& canvas);
+// The handle under a text caret, its point up.
+void caretHandle(QPainter& painter, const QSize& size, bool pressed);
+
+} // namespace Surfaces

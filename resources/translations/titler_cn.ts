@@ -1,0 +1,146 @@
+<?xml version="1.0" encoding="utf-8"?>
+<!DOCTYPE TS>
+<TS version="2.1" language="zh_CN" sourcelanguage="en">
+<context>
+    <name>TitlerWindow</name>
+    <message>
+        <source>Titler</source>
+        <translation>字幕机</translation>
+    </message>
+    <message>
+        <source>Move</source>
+        <translation>移动</translation>
+    </message>
+    <message>
+        <source>Done</source>
+        <translation>完成</translation>
+    </message>
+</context>
+<context>
+    <name>ToolsBar</name>
+    <message>
+        <source>Folder</source>
+        <translation>文件夹</translation>
+    </message>
+    <message>
+        <source>New Text</source>
+        <translation>新建文本</translation>
+    </message>
+    <message>
+        <source>Delete</source>
+        <translation>删除</translation>
+    </message>
+    <message>
+        <source>Undo</source>
+        <translation>撤销</translation>
+    </message>
+    <message>
+        <source>Redo</source>
+        <translation>重做</translation>
+    </message>
+    <message>
+        <source>Safe Area</source>
+        <translation>安全区</translation>
+    </message>
+    <message>
+        <source>Canvas</source>
+        <translation>画布</translation>
+    </message>
+    <message>
+        <source>Close</source>
+        <translation>关闭</translation>
+    </message>
+    <message>
+        <source>Black</source>
+        <translation>黑色</translation>
+    </message>
+    <message>
+        <source>White</source>
+        <translation>白色</translation>
+    </message>
+    <message>
+        <source>Checker</source>
+        <translation>棋盘格</translation>
+    </message>
+</context>
+<context>
+    <name>CanvasScene</name>
+    <message>
+        <source>Title goes here</source>
+        <translation>在此输入标题</translation>
+    </message>
+    <message>
+        <source>Text Input</source>
+        <translation>文本输入</translation>
+    </message>
+</context>
+<context>
+    <name>GraphicsText</name>
+    <message>
+        <source>Title goes here</source>
+        <translation>在此输入标题</translation>
+    </message>
+    <message>
+        <source>Text Input</source>
+        <translation>文本输入</translation>
+    </message>
+</context>
+<context>
+    <name>ArchiveList</name>
+    <message>
+        <source>Create New</source>
+        <translation>新建</translation>
+    </message>
+    <message>
+        <source>Copy</source>
+        <translation>复制</translation>
+    </message>
+    <message>
+        <source>Paste</source>
+        <translation>粘贴</translation>
+    </message>
+    <message>
+        <source>Delete</source>
+        <translation>删除</translation>
+    </message>
+    <message>
+        <source>Add User</source>
+        <translation>添加到用户模板</translation>
+    </message>
+</context>
+<context>
+    <name>FolderPicker</name>
+    <message>
+        <source>Untitled</source>
+        <translation>未命名</translation>
+    </message>
+    <message>
+        <source>folder</source>
+        <translation>文件夹</translation>
+    </message>
+    <message>
+        <source>File</source>
+        <translation>文件</translation>
+    </message>
+    <message>
+        <source>Folder Name</source>
+        <translation>文件夹名称</translation>
+    </message>
+    <message>
+        <source>Duplicate</source>
+        <translation>复制</translation>
+    </message>
+    <message>
+        <source>New Folder</source>
+        <translation>新建文件夹</translation>
+    </message>
+    <message>
+        <source>Open</source>
+        <translation>打开</translation>
+    </message>
+    <message>
+        <source>Cancel</source>
+        <translation>取消</translation>
+    </message>
+</context>
+</TS>

@@ -1,0 +1,146 @@
+<?xml version="1.0" encoding="utf-8"?>
+<!DOCTYPE TS>
+<TS version="2.1" language="en" sourcelanguage="en">
+<context>
+    <name>TitlerWindow</name>
+    <message>
+        <source>Titler</source>
+        <translation>Titler</translation>
+    </message>
+    <message>
+        <source>Move</source>
+        <translation>Move</translation>
+    </message>
+    <message>
+        <source>Done</source>
+        <translation>Done</translation>
+    </message>
+</context>
+<context>
+    <name>ToolsBar</name>
+    <message>
+        <source>Folder</source>
+        <translation>Folder</translation>
+    </message>
+    <message>
+        <source>New Text</source>
+        <translation>New Text</translation>
+    </message>
+    <message>
+        <source>Delete</source>
+        <translation>Delete</translation>
+    </message>
+    <message>
+        <source>Undo</source>
+        <translation>Undo</translation>
+    </message>
+    <message>
+        <source>Redo</source>
+        <translation>Redo</translation>
+    </message>
+    <message>
+        <source>Safe Area</source>
+        <translation>Safe Area</translation>
+    </message>
+    <message>
+        <source>Canvas</source>
+        <translation>Canvas</translation>
+    </message>
+    <message>
+        <source>Close</source>
+        <translation>Close</translation>
+    </message>
+    <message>
+        <source>Black</source>
+        <translation>Black</translation>
+    </message>
+    <message>
+        <source>White</source>
+        <translation>White</translation>
+    </message>
+    <message>
+        <source>Checker</source>
+        <translation>Checker</translation>
+    </message>
+</context>
+<context>
+    <name>CanvasScene</name>
+    <message>
+        <source>Title goes here</source>
+        <translation>Title goes here</translation>
+    </message>
+    <message>
+        <source>Text Input</source>
+        <translation>Text Input</translation>
+    </message>
+</context>
+<context>
+    <name>GraphicsText</name>
+    <message>
+        <source>Title goes here</source>
+        <translation>Title goes here</translation>
+    </message>
+    <message>
+        <source>Text Input</source>
+        <translation>Text Input</translation>
+    </message>
+</context>
+<context>
+    <name>ArchiveList</name>
+    <message>
+        <source>Create New</source>
+        <translation>Create New</translation>
+    </message>
+    <message>
+        <source>Copy</source>
+        <translation>Copy</translation>
+    </message>
+    <message>
+        <source>Paste</source>
+        <translation>Paste</translation>
+    </message>
+    <message>
+        <source>Delete</source>
+        <translation>Delete</translation>
+    </message>
+    <message>
+        <source>Add User</source>
+        <translation>Add User</translation>
+    </message>
+</context>
+<context>
+    <name>FolderPicker</name>
+    <message>
+        <source>Untitled</source>
+        <translation>Untitled</translation>
+    </message>
+    <message>
+        <source>folder</source>
+        <translation>folder</translation>
+    </message>
+    <message>
+        <source>File</source>
+        <translation>File</translation>
+    </message>
+    <message>
+        <source>Folder Name</source>
+        <translation>Folder Name</translation>
+    </message>
+    <message>
+        <source>Duplicate</source>
+        <translation>Duplicate</translation>
+    </message>
+    <message>
+        <source>New Folder</source>
+        <translation>New Folder</translation>
+    </message>
+    <message>
+        <source>Open</source>
+        <translation>Open</translation>
+    </message>
+    <message>
+        <source>Cancel</source>
+        <translation>Cancel</translation>
+    </message>
+</context>
+</TS>

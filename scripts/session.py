@@ -1,0 +1,313 @@
+"""Starts and drives the programs of a build: an X display of their own, the appliance and the titler.
+
+Used by scripts/run and by the end-to-end tests. Python's standard library only. Whatever is started here is also ended
+here, by its own process id.
+"""
+import atexit
+import ctypes
+import json
+import os
+import re
+import signal
+import struct
+import subprocess
+import threading
+import time
+import zlib
+
+ROOT = os.path.dirname(os.path.dirname(os.path.abspath(__file__)))
+WIDTH, HEIGHT = 1920, 1080
+TITLER_PORT = 1003
+MAIN_PORT = 1000
+SUB_PANEL_PORT = 1002
+
+
+class SessionError(Exception):
+    """Something that should have happened has not, in the time it had."""
+
+
+def wait_until(condition, timeout, what):
+    """Polls until condition() is true and returns its value; raises SessionError after timeout seconds."""
+    deadline = time.monotonic() + timeout
+    while True:
+        value = condition()
+        if value:
+            return value
+        if time.monotonic() > deadline:
+            raise SessionError(f"waited {timeout} s in vain for {what}")
+        time.sleep(0.02)
+
+
+def listening(port):
+    """Whether a process listens on 127.0.0.1:port; asks the kernel, so that no connection is made."""
+    wanted = f"0100007F:{port:04X}"
+    with open("/proc/net/tcp", encoding="ascii") as table:
+        return any(fields[1] == wanted and fields[3] == "0A" for fields in map(str.split, table))
+
+
+def may_bind_low_ports():
+    if os.geteuid() == 0:
+        return True
+    with open("/proc/sys/net/ipv4/ip_unprivileged_port_start", encoding="ascii") as value:
+        return int(value.read()) <= MAIN_PORT
+
+
+LIBC = ctypes.CDLL(None)
+PR_SET_PDEATHSIG = 1
+
+
+def die_with_parent():
+    """Runs in a new child: a killed test must not leave servers and titlers behind."""
+    LIBC.prctl(PR_SET_PDEATHSIG, signal.SIGKILL)
+
+
+class Process:
+    """A child process with its output in a file. It is ended when this program ends, however that comes."""
+
+    def __init__(self, arguments, log, environment=None, **options):
+        self.log = log
+        self.name = os.path.basename(arguments[0])
+        with open(log, "ab") as stream:
+            options.setdefault("stdin", subprocess.DEVNULL)
+            options.setdefault("stdout", stream)
+            self.popen = subprocess.Popen(arguments, stderr=stream, env=environment, preexec_fn=die_with_parent,
+                                          **options)
+        atexit.register(self.stop)
+
+    @property
+    def pid(self):
+        return self.popen.pid
+
+    def running(self):
+        return self.popen.poll() is None
+
+    def signal(self, number):
+        if self.running():
+            self.popen.send_signal(number)
+
+    def wait(self, timeout):
+        """The exit code; raises SessionError when the process is still there after timeout seconds."""
+        try:
+            return self.popen.wait(timeout)
+        except subprocess.TimeoutExpired:
+            raise SessionError(f"{self.name} has not ended after {timeout} s") from None
+
+    def stop(self, timeout=10):
+        self.signal(signal.SIGTERM)
+        try:
+            self.popen.wait(timeout)
+        except subprocess.TimeoutExpired:
+            self.signal(signal.SIGKILL)
+            self.popen.wait()
+        return self.popen.returncode
+
+    def check(self):
+        if not self.running():
+            raise SessionError(f"{self.name} has ended with {self.popen.returncode}, see {self.log}")
+
+
+class Display:
+    """An Xvfb of 1920x1080 with openbox on it. Its frame buffer lies in a file, which screenshots are read from."""
+
+    def __init__(self, folder, environment):
+        os.makedirs(folder, exist_ok=True)
+        self.folder = folder
+        read_end, write_end = os.pipe()
+        self.server = Process(
+            ["Xvfb", "-displayfd", str(write_end), "-screen", "0", f"{WIDTH}x{HEIGHT}x24", "-nolisten", "tcp",
+             "-noreset", "-fbdir", folder],
+            os.path.join(folder, "xvfb.log"), pass_fds=[write_end])
+        os.close(write_end)
+        self.manager = None
+        try:
+            with os.fdopen(read_end) as stream:
+                number = stream.readline().strip()
+            if not number:
+                raise SessionError(f"Xvfb did not start, see {self.server.log}")
+            self.name = f":{number}"
+            self.environment = dict(environment, DISPLAY=self.name)
+            self.manager = Process(["openbox", "--sm-disable"], os.path.join(folder, "openbox.log"), self.environment)
+            wait_until(self._is_managed, 20, "openbox")
+        except BaseException:
+            self.stop()
+            raise
+
+    def _is_managed(self):
+        self.manager.check()
+        done = subprocess.run(["xdotool", "get_desktop"], env=self.environment, stdout=subprocess.DEVNULL,
+                              stderr=subprocess.DEVNULL, check=False)
+        return done.returncode == 0
+
+    def stop(self):
+        if self.manager:
+            self.manager.stop()
+        self.server.stop()
+
+    def xdotool(self, *arguments):
+        done = subprocess.run(["xdotool", *map(str, arguments)], env=self.environment, capture_output=True, text=True,
+                              check=False, timeout=120)
+        if done.returncode != 0:
+            raise SessionError(f"xdotool {' '.join(map(str, arguments))}: {done.stderr.strip()}")
+        return done.stdout
+
+    def find_window(self, title):
+        """The id of the visible window with exactly this title, or None."""
+        done = subprocess.run(["xdotool", "search", "--onlyvisible", "--name", f"^{re.escape(title)}$"],
+                              env=self.environment, capture_output=True, text=True, check=False)
+        ids = done.stdout.split()
+        return ids[-1] if done.returncode == 0 and ids else None
+
+    def geometry(self, window):
+        """x, y, width and height of a window's contents on the screen."""
+        shell = self.xdotool("getwindowgeometry", "--shell", window)
+        values = dict(line.split("=", 1) for line in shell.splitlines() if "=" in line)
+        return tuple(int(values[key]) for key in ("X", "Y", "WIDTH", "HEIGHT"))
+
+    def click(self, x, y, button=1):
+        self.xdotool("mousemove", "--sync", x, y, "click", button)
+
+    def grab(self):
+        """The screen as (width, height, RGB bytes)."""
+        with open(os.path.join(self.folder, "Xvfb_screen0"), "rb") as stream:
+            data = stream.read()
+        header = struct.unpack(">25I", data[:100])
+        header_size, width, height = header[0], header[4], header[5]
+        bits_per_pixel, line, colours = header[11], header[12], header[19]
+        if bits_per_pixel != 32 or line != width * 4:
+            raise SessionError(f"unexpected frame buffer of {bits_per_pixel} bits, {line} bytes a line")
+        start = header_size + colours * 12
+        pixels = data[start:start + line * height]
+        rgb = bytearray(width * height * 3)
+        rgb[0::3], rgb[1::3], rgb[2::3] = pixels[2::4], pixels[1::4], pixels[0::4]
+        return width, height, bytes(rgb)
+
+    def screenshot(self, path):
+        write_png(path, *self.grab())
+
+    def wait_until_still(self, timeout=15, quiet=0.3):
+        """Waits until the screen has not changed for quiet seconds."""
+        deadline = time.monotonic() + timeout
+        last, since = self.grab()[2], time.monotonic()
+        while time.monotonic() - since < quiet:
+            if time.monotonic() > deadline:
+                raise SessionError(f"the screen still changes after {timeout} s")
+            time.sleep(0.05)
+            now = self.grab()[2]
+            if now != last:
+                last, since = now, time.monotonic()
+
+
+def write_png(path, width, height, rgb):
+    def chunk(kind, body):
+        return struct.pack(">I", len(body)) + kind + body + struct.pack(">I", zlib.crc32(kind + body))
+
+    line = width * 3
+    rows = b"".join(b"\0" + rgb[y * line:(y + 1) * line] for y in range(height))
+    with open(path, "wb") as stream:
+        stream.write(b"\x89PNG\r\n\x1a\n" + chunk(b"IHDR", struct.pack(">IIBBBBB", width, height, 8, 2, 0, 0, 0)) +
+                     chunk(b"IDAT", zlib.compress(rows, 1)) + chunk(b"IEND", b""))
+
+
+class Appliance(Process):
+    """The appliance: commands go in as lines, events come out as one JSON object a line and are kept in events."""
+
+    def __init__(self, build, log, environment):
+        self.events = []
+        self.changed = threading.Condition()
+        self.output = open(log + ".jsonl", "w", encoding="utf-8")  # pylint: disable=consider-using-with
+        super().__init__([os.path.join(build, "bin", "appliance")], log, environment, stdin=subprocess.PIPE,
+                         stdout=subprocess.PIPE, text=True, encoding="utf-8", bufsize=1)
+        self.reader = threading.Thread(target=self._read, daemon=True)
+        self.reader.start()
+
+    def _read(self):
+        for line in self.popen.stdout:
+            self.output.write(line)
+            self.output.flush()
+            try:
+                event = json.loads(line)
+            except ValueError:
+                event = {"event": "unreadable", "line": line}
+            with self.changed:
+                self.events.append(event)
+                self.changed.notify_all()
+
+    def command(self, line):
+        try:
+            self.popen.stdin.write(line + "\n")
+            self.popen.stdin.flush()
+        except OSError as error:
+            raise SessionError(f"the appliance took no command ({error}), see {self.log}") from None
+
+    def mark(self):
+        """A point in the stream of events, to wait from."""
+        with self.changed:
+            return len(self.events)
+
+    def since(self, start):
+        """The events since start."""
+        with self.changed:
+            return self.events[start:]
+
+    def wait_for(self, wanted, timeout, start, what):
+        """The first event since start for which wanted(event) is true."""
+        deadline = time.monotonic() + timeout
+        with self.changed:
+            while True:
+                for event in self.events[start:]:
+                    if wanted(event):
+                        return event
+                left = deadline - time.monotonic()
+                if left <= 0:
+                    raise SessionError(f"waited {timeout} s in vain for {what}; got {self.events[start:]}")
+                self.changed.wait(left)
+
+    def wait_event(self, name, timeout, start, **fields):
+        """The first event since start with this name and these values."""
+        return self.wait_for(
+            lambda event: event.get("event") == name and all(event.get(key) == fields[key] for key in fields),
+            timeout, start, f"{name} {fields}")
+
+    def stop(self, timeout=10):
+        if self.running():
+            try:
+                self.popen.stdin.close()
+            except OSError:
+                pass
+        code = super().stop(timeout)
+        self.reader.join(5)
+        self.output.close()
+        return code
+
+
+def program_environment(build, **changes):
+    """The environment of the programs: the build's own fonts, UTF-8, and the changes given."""
+    environment = dict(os.environ)
+    environment.update(
+        LC_ALL="C.UTF-8",
+        FONTCONFIG_FILE=os.path.join(build, "fonts", "fonts.conf"),
+        QT_QPA_PLATFORM="xcb",
+        # What is in reach of the user's desktop must not change the looks or the input of the titler.
+        QT_QPA_PLATFORMTHEME="none",
+        NO_AT_BRIDGE="1",
+    )
+    for name in ("QT_IM_MODULE", "QT_STYLE_OVERRIDE", "QT_SCALE_FACTOR", "XMODIFIERS"):
+        environment.pop(name, None)
+    environment.update({name: str(value) for name, value in changes.items()})
+    return environment
+
+
+def start_titler(build, log, environment, arguments=()):
+    return Process([os.path.join(build, "bin", "titler"), *arguments], log, environment)
+
+
+def port_offset(environment):
+    return int(environment.get("K2SYS_PORT_OFFSET") or 0)
+
+
+def wait_listening(process, port, timeout=60):
+    def ready():
+        process.check()
+        return listening(port)
+
+    wait_until(ready, timeout, f"{process.name} to listen on {port}")

@@ -1,0 +1,102 @@
+// The two sibling processes as this program needs them: they accept connections, take every call and remember
+// which methods of which services were called. They never answer.
+#pragma once
+
+#include "messaging/ptc/Event.h"
+#include "messaging/ptc/Receiver.h"
+#include "messaging/ptc/SocketRemoteReceiver.h"
+
+#include <QByteArray>
+#include <QList>
+#include <memory>
+#include <mutex>
+#include <unistd.h>
+
+struct SiblingCall {
+    long service = 0;
+    long method = 0;
+    QByteArray data;
+};
+
+class Siblings
+{
+public:
+    // Sets the port offset of this process to one whose ports are free.
+    bool listenOnFreePorts()
+    {
+        for (int i = 0; i < OFFSETS_TRIED; ++i) {
+            const int offset = FIRST_OFFSET + OFFSET_STEP * ((::getpid() + i) % OFFSETS);
+            qputenv("K2SYS_PORT_OFFSET", QByteArray::number(offset));
+            auto main = std::make_unique<SocketRemoteReceiver>(0);
+            auto subPanel = std::make_unique<SocketRemoteReceiver>(0);
+            if (!main->initialize(1000) || !subPanel->initialize(1002))
+                continue;
+            main->addReceiver(new Recorder(1, *this));
+            subPanel->addReceiver(new Recorder(3, *this));
+            mMain = std::move(main);
+            mSubPanel = std::move(subPanel);
+            return true;
+        }
+        return false;
+    }
+
+    // The method ids called of the service, in their order.
+    QList<long> methodsOf(long service) const
+    {
+        const std::lock_guard lock(mMutex);
+        QList<long> methods;
+        for (const SiblingCall& call : mCalls) {
+            if (call.service == service)
+                methods << call.method;
+        }
+        return methods;
+    }
+
+    // Packed arguments of the last call of the method; empty when it was not called.
+    QByteArray lastArguments(long service, long method) const
+    {
+        const std::lock_guard lock(mMutex);
+        for (auto call = mCalls.crbegin(); call != mCalls.crend(); ++call) {
+            if (call->service == service && call->method == method)
+                return call->data;
+        }
+        return {};
+    }
+
+    void forget()
+    {
+        const std::lock_guard lock(mMutex);
+        mCalls.clear();
+    }
+
+private:
+    static constexpr int FIRST_OFFSET = 10000; // below the ports that the system gives to clients
+    static constexpr int OFFSET_STEP = 10;
+    static constexpr int OFFSETS = 1900;
+    static constexpr int OFFSETS_TRIED = 20;
+
+    class Recorder : public PTC::Receiver
+    {
+    public:
+        Recorder(long id, Siblings& siblings) : Receiver(id), mSiblings(siblings) {}
+        void recv(PTC::Event* event) override
+        {
+            {
+                const std::lock_guard lock(mSiblings.mMutex);
+                mSiblings.mCalls << SiblingCall{event->getObjectId(), event->getMethodId(),
+                                                QByteArray(static_cast<const char*>(event->getData()),
+                                                           static_cast<qsizetype>(event->getSize()))};
+            }
+            delete[] static_cast<char*>(event->getData());
+            delete event;
+        }
+
+    private:
+        Siblings& mSiblings;
+    };
+
+    mutable std::mutex mMutex;
+    QList<SiblingCall> mCalls;
+    std::unique_ptr<SocketRemoteReceiver> mMain;
+    std::unique_ptr<SocketRemoteReceiver> mSubPanel;
+};

@@ -1,0 +1,364 @@
+// The main window against siblings that only listen: layout, requests, closing, masks, move mode, language.
+#include "Siblings.h"
+#include "app/APPEventFilter.h"
+#include "app/EditContextController.h"
+#include "app/EditTitlerController.h"
+#include "app/ShowMessageController.h"
+#include "app/ShowTitlerController.h"
+#include "app/SystemSetupInfoController.h"
+#include "app/TitlerAPPEventFilterController.h"
+#include "app/TitlerWindow.h"
+#include "app/ToolsBar.h"
+#include "canvas/CanvasScene.h"
+#include "canvas/GraphicsView.h"
+#include "document/Archive.h"
+#include "document/ArchiveController.h"
+#include "document/ArchiveOrder.h"
+#include "document/TText.h"
+#include "document/TextStyle.h"
+#include "document/TitleParser.h"
+#include "library/ArchiveList.h"
+#include "touchui/KSInputContext.h"
+#include "touchui/KSPushbutton.h"
+
+#include <QAction>
+#include <QApplication>
+#include <QDir>
+#include <QLabel>
+#include <QSignalSpy>
+#include <QTemporaryDir>
+#include <QTest>
+
+class tst_titler_window : public QObject
+{
+    Q_OBJECT
+
+private slots:
+    void initTestCase();
+    void cleanupTestCase();
+    void cleanup();
+
+    void hiddenAfterStart();
+    void layoutOfTheCanvas();
+    void folderRequestShowsItsTitles();
+    void fileRequestShowsTheTitle();
+    void secondRequestIsDropped();
+    void missingPathHidesAgain();
+    void closeHidesAndEmpties();
+    void closeWithNewFilesAsksFirst();
+    void otherMessagesDoNotClose();
+    void createSessionAnswersInFolderOrder();
+    void focusCommandLeavesACleanStackClean();
+    void moveModeEatsPressesOutsideTheList();
+    void masksOnlyWhileVisible();
+    void missingFontIsReportedOnShow();
+    void windowManagerCloseKeepsTheProcess();
+    void languageFallsBackToEnglish();
+
+private:
+    QString writeTitle(const QString& folder, const QString& stem);
+    QString writeFolder(const QString& name, const QStringList& stems);
+    void request(const QString& path, int mode = _titler_paramter::CREATE_OR_EDIT);
+    ArchiveList* list() const { return mWindow->findChild<ArchiveList*>(); }
+    CanvasScene* scene() const { return mWindow->findChild<CanvasScene*>(); }
+
+    QTemporaryDir mData;
+    Siblings mSiblings;
+    TitlerWindow* mWindow = nullptr;
+};
+
+void tst_titler_window::initTestCase()
+{
+    QVERIFY(mSiblings.listenOnFreePorts());
+    APPEventFilter::instance();
+    Q_INIT_RESOURCE(UILibrary);
+    mWindow = new TitlerWindow(true, nullptr);
+    pMainWindow = mWindow;
+    mWindow->setRealClose(false);
+}
+
+void tst_titler_window::cleanupTestCase()
+{
+    delete mWindow;
+    pMainWindow = nullptr;
+    APPEventFilter::release();
+}
+
+void tst_titler_window::cleanup()
+{
+    EditContextController::getInstance()->setITitlerNoCallBack();
+    EditContextController::getInstance()->resultCallBack(nullptr);
+    if (mWindow->isVisible())
+        mWindow->closeTitlerWindow();
+    QVERIFY(!mWindow->isVisible());
+}
+
+QString tst_titler_window::writeTitle(const QString& folder, const QString& stem)
+{
+    Archive archive;
+    archive.setPath((folder + '/' + stem + ".xml").toStdString());
+    archive.setThumbnailBig((stem + "_1920.png").toStdString());
+    archive.setThumbnailMiddle((stem + "_960.png").toStdString());
+    archive.setThumbnailSmall((stem + "_240.png").toStdString());
+    archive.setThumbnailBlack((stem + "_240S.png").toStdString());
+    auto* text = new TText;
+    text->setTextObjectID(1);
+    text->setText("Ab");
+    text->setXValue(100);
+    text->setYValue(100);
+    text->setZValue(1);
+    std::vector<TextStyle*> items;
+    for (const char* character : {"A", "b"}) {
+        items.push_back(new TextStyle);
+        items.back()->setText(character);
+    }
+    text->setTextItems(items);
+    archive.setText({text});
+    TitleParser().writeOneTitle(&archive);
+    return QString::fromStdString(archive.getPath());
+}
+
+QString tst_titler_window::writeFolder(const QString& name, const QStringList& stems)
+{
+    const QString folder = mData.filePath(name);
+    QDir().mkpath(folder);
+    QList<ArchiveOrder*> rows;
+    for (const QString& stem : stems) {
+        writeTitle(folder, stem);
+        rows << new ArchiveOrder;
+        rows.last()->setArchiveIndex(static_cast<int>(rows.size()) - 1);
+        rows.last()->setArchivePath((stem + ".xml").toStdString());
+    }
+    ArchiveController().saveArchiveListOrder(folder, rows);
+    qDeleteAll(rows);
+    return folder;
+}
+
+void tst_titler_window::request(const QString& path, int mode)
+{
+    mWindow->showTitlerWindow({mode, path.toStdWString()});
+}
+
+void tst_titler_window::hiddenAfterStart()
+{
+    QVERIFY(!mWindow->isVisible());
+    QVERIFY(!mWindow->windowIsVisible());
+}
+
+void tst_titler_window::layoutOfTheCanvas()
+{
+    request(writeFolder("layout", {"t1"}));
+    auto* view = mWindow->findChild<GraphicsView*>();
+    QCOMPARE(QRect(view->mapTo(mWindow, QPoint(0, 0)), view->size()), QRect(609, 97, 1280, 720));
+    QCOMPARE(mWindow->size(), QSize(1920, 1080));
+    QCOMPARE(list()->size(), QSize(549, 997));
+    QVERIFY(mWindow->windowIsVisible());
+}
+
+void tst_titler_window::folderRequestShowsItsTitles()
+{
+    const QString folder = writeFolder("速報 folder", {"t1", "t2"});
+    request(folder);
+    QCOMPARE(list()->getCurrentPath(), folder);
+    QCOMPARE(scene()->getTextItemList().size(), 1);
+    QCOMPARE(QString::fromStdString(scene()->archive()->getPath()), folder + "/t1.xml");
+}
+
+void tst_titler_window::fileRequestShowsTheTitle()
+{
+    const QString folder = writeFolder("files", {"t1", "t2", "t3"});
+    request(folder + "/t2.xml");
+    QCOMPARE(QString::fromStdString(scene()->archive()->getPath()), folder + "/t2.xml");
+}
+
+void tst_titler_window::secondRequestIsDropped()
+{
+    const QString first = writeFolder("first", {"t1"});
+    const QString second = writeFolder("second", {"t1"});
+    request(first);
+    request(second);
+    QCOMPARE(list()->getCurrentPath(), first);
+}
+
+void tst_titler_window::missingPathHidesAgain()
+{
+    request(mData.filePath("nowhere"));
+    QVERIFY(!mWindow->isVisible());
+}
+
+void tst_titler_window::closeHidesAndEmpties()
+{
+    request(writeFolder("closing", {"t1"}));
+    QMetaObject::invokeMethod(mWindow->findChild<ToolsBar*>(), "closeButtonClick");
+    QVERIFY(!mWindow->isVisible());
+    QVERIFY(!mWindow->windowIsVisible());
+    QVERIFY(list()->getCurrentPath().isEmpty());
+    QVERIFY(scene()->getTextItemList().isEmpty());
+}
+
+void tst_titler_window::closeWithNewFilesAsksFirst()
+{
+    struct Silent : ITitlerCallBack {
+        void finishTitlerCreateCallback(_CALLBACK_TITLER_PARAMTER) override
+        {
+            QFAIL("an edit session has no result");
+        }
+    };
+    request(writeFolder("asking", {"t1"}));
+    EditContextController::getInstance()->resultCallBack(new Silent);
+    EditContextController::getInstance()->insertFilePath(L"new.xml");
+    mWindow->closeTitlerWindow();
+    QVERIFY(mWindow->isVisible());
+    mWindow->continueCloseTitler({1, MessageDefine::CLOSE_OK, MessageDef::MESSAGE_CONFIRM_CLOSE});
+    QVERIFY(!mWindow->isVisible());
+}
+
+void tst_titler_window::otherMessagesDoNotClose()
+{
+    request(writeFolder("others", {"t1"}));
+    mWindow->continueCloseTitler({1, MessageDefine::CLOSE_OK, MessageDef::MESSAGE_FONT_MISSING});
+    QVERIFY(mWindow->isVisible());
+}
+
+void tst_titler_window::createSessionAnswersInFolderOrder()
+{
+    struct Result {
+        int calls = 0;
+        int count = 0;
+        std::wstring path;
+    };
+    struct CallBack : ITitlerCallBack {
+        explicit CallBack(Result& r) : result(r) {}
+        void finishTitlerCreateCallback(_CALLBACK_TITLER_PARAMTER param) override
+        {
+            ++result.calls;
+            result.count = param.count;
+            result.path = param.path;
+        }
+        Result& result;
+    };
+    Result result;
+    const QString folder = writeFolder("creating", {"t1"});
+    EditContextController* context = EditContextController::getInstance();
+    context->resultCallBack(new CallBack(result));
+    QSignalSpy templates(list(), &ArchiveList::startTemplatePicker);
+    request(folder);
+    context->showTitlerCreate(5); // the window is open: only the context takes note
+    Archive blank;
+    list()->createArchiveFromTemplate(&blank);
+    QTest::qWait(2); // names are made of the time in milliseconds
+    list()->createArchiveFromTemplate(&blank);
+    mWindow->closeTitlerWindow();
+    QVERIFY(!mWindow->isVisible());
+    QCOMPARE(result.calls, 1);
+    QCOMPARE(result.count, 2);
+    QCOMPARE(QString::fromStdWString(result.path), folder);
+    QVERIFY(!context->isCreateNew());
+}
+
+void tst_titler_window::focusCommandLeavesACleanStackClean()
+{
+    struct Focus : QUndoCommand {
+        int id() const override { return 1; }
+    };
+    QAction* undo = nullptr;
+    for (QAction* action : mWindow->findChildren<QAction*>(QString(), Qt::FindDirectChildrenOnly)) {
+        if (action->text().startsWith("Undo"))
+            undo = action;
+    }
+    QVERIFY(undo);
+    mWindow->pushUndoStack(new Focus);
+    QVERIFY(!undo->isEnabled());
+    mWindow->pushUndoStack(new QUndoCommand);
+    QVERIFY(undo->isEnabled());
+    mWindow->clearUndoStack();
+    QVERIFY(!undo->isEnabled());
+}
+
+void tst_titler_window::moveModeEatsPressesOutsideTheList()
+{
+    request(writeFolder("moving", {"t1"}));
+    QVERIFY(QTest::qWaitForWindowExposed(mWindow));
+    KSPushbutton* move = nullptr;
+    for (KSPushbutton* button : mWindow->findChildren<KSPushbutton*>()) {
+        if (button->text() == "Move")
+            move = button;
+    }
+    QVERIFY(move);
+    QTest::mouseClick(move, Qt::LeftButton);
+    QVERIFY(mWindow->archiveListIsMoveMode());
+    QCOMPARE(move->text(), QString("Done"));
+    QTest::mouseClick(list(), Qt::LeftButton, {}, QPoint(20, 900));
+    QVERIFY(mWindow->archiveListIsMoveMode());
+    QTest::mouseClick(mWindow, Qt::LeftButton, {}, QPoint(1000, 950));
+    QVERIFY(!mWindow->archiveListIsMoveMode());
+    QCOMPARE(move->text(), QString("Move"));
+
+    QTest::mouseClick(move, Qt::LeftButton);
+    QTest::mouseClick(move, Qt::LeftButton);
+    QVERIFY(!mWindow->archiveListIsMoveMode());
+    QTest::mouseClick(move, Qt::LeftButton);
+    emit TitlerAPPEventFilterController::getInstance()->signalRestoreOriginal();
+    QVERIFY(!mWindow->archiveListIsMoveMode());
+}
+
+void tst_titler_window::masksOnlyWhileVisible()
+{
+    ShowMessageController* messages = ShowMessageController::getInstance();
+    QSignalSpy spy(messages, &ShowMessageController::signalsShowDialogMaskWidget);
+    messages->showDialogOpacityWidget();
+    QCOMPARE(spy.size(), 0);
+
+    request(writeFolder("masks", {"t1"}));
+    messages->showDialogOpacityWidget();
+    QCOMPARE(spy.size(), 1);
+    QVERIFY(!mWindow->testAttribute(Qt::WA_AcceptTouchEvents));
+    messages->showMessageOpacityWidget();
+    messages->hideMessageOpacityWidget();
+    QVERIFY(!mWindow->testAttribute(Qt::WA_AcceptTouchEvents));
+    messages->hideDialogOpacityWidget();
+    QVERIFY(mWindow->testAttribute(Qt::WA_AcceptTouchEvents));
+}
+
+void tst_titler_window::missingFontIsReportedOnShow()
+{
+    mWindow->setHasMessageToShowInformation(true, "No Such Family");
+    request(writeFolder("fonts", {"t1"}));
+    // The message left once; a second show has nothing to tell.
+    QVERIFY(mWindow->isVisible());
+    mWindow->closeTitlerWindow();
+    request(writeFolder("fonts", {"t1"}));
+    QVERIFY(mWindow->isVisible());
+}
+
+void tst_titler_window::windowManagerCloseKeepsTheProcess()
+{
+    QSignalSpy quit(qApp, &QCoreApplication::aboutToQuit);
+    request(writeFolder("wm", {"t1"}));
+    mWindow->close();
+    QVERIFY(!mWindow->isVisible());
+    QCOMPARE(quit.size(), 0);
+    request(mData.filePath("wm"));
+    QVERIFY(mWindow->isVisible());
+}
+
+void tst_titler_window::languageFallsBackToEnglish()
+{
+    mWindow->slotSystemLanguageChanged(SystemSetupDef::emSystemLanguageChinese);
+    QVERIFY(mWindow->styleSheet().contains("DFHeiW5-A"));
+    mWindow->slotSystemLanguageChanged(static_cast<SystemSetupDef::emSystemLanguageType>(42));
+    QVERIFY(mWindow->styleSheet().contains("'KST'"));
+    QCOMPARE(mWindow->windowTitle(), QString("Titler"));
+}
+
+int main(int argc, char** argv)
+{
+    KSInputContext::install();
+    QApplication application(argc, argv);
+    application.setObjectName("Titler");
+    QApplication::setQuitOnLastWindowClosed(false);
+    tst_titler_window test;
+    return QTest::qExec(&test, argc, argv);
+}
+
+#include "tst_titler_window.moc"

@@ -1,0 +1,265 @@
+"""What the end-to-end tests share: a titler and an appliance on a display and on data of their own.
+
+Every test gets a fresh data path, log folder, display and pair of processes. When a test fails, its screenshot, the
+logs and the picture differences stay under tests/e2e/ in the build tree.
+"""
+import json
+import os
+import shutil
+import subprocess
+import sys
+import tempfile
+import time
+import unittest
+import xml.etree.ElementTree
+
+HERE = os.path.dirname(os.path.abspath(__file__))
+sys.path.insert(0, os.path.join(os.path.dirname(os.path.dirname(HERE)), "scripts"))
+
+import session  # noqa: E402  pylint: disable=wrong-import-position
+
+BUILD = os.environ.get("TITLER_BUILD", os.path.join(session.ROOT, "build"))
+OFFSET = int(os.environ.get("TITLER_TEST_OFFSET", "21000"))
+# Sanitizers make everything slower, never wrong.
+SLOW = 4 if os.path.basename(BUILD).endswith("asan") else 1
+
+# Where things are in the window, in its own pixels.
+CANVAS = (609, 97, 1280, 720)
+TOP_WINDOW_MAIN = 2
+LIST_POINT = (380, 130)
+LIST_ROW = 143
+PICTURES = {"_1920.png": (1920, 1080), "_960.png": (960, 540), "_240.png": (240, 135), "_240S.png": (240, 135)}
+
+
+def pngdiff(*arguments):
+    done = subprocess.run([os.path.join(BUILD, "tests", "titler_pngdiff"), *map(str, arguments)],
+                          capture_output=True, text=True, check=False)
+    if done.returncode != 0:
+        raise session.SessionError(f"titler_pngdiff {arguments}: {done.stderr.strip()}")
+    return json.loads(done.stdout)
+
+
+class Title:
+    """A title file as it lies on disk; read anew at each question."""
+
+    def __init__(self, path):
+        self.path = path
+        self.stem = path[:-len(".xml")]
+
+    def root(self):
+        return xml.etree.ElementTree.parse(self.path).getroot()
+
+    def texts(self):
+        """The plain text of each text object, in the order of the file."""
+        return [content.get("text") for content in self.root().iter("content")]
+
+    def items(self):
+        """For each text object the texts of its runs."""
+        return [[item.get("text") for item in content.iter("text-item")] for content in self.root().iter("content")]
+
+    def picture(self, suffix):
+        return self.stem + suffix
+
+
+class TitlerTest(unittest.TestCase):
+    """A test case with a running appliance and titler."""
+
+    titler_arguments = ()
+    environment_changes = {}
+
+    def setUp(self):
+        self.keep = os.path.join(BUILD, "tests", "e2e", self.id().split(".", 1)[-1])
+        shutil.rmtree(self.keep, ignore_errors=True)
+        os.makedirs(self.keep)
+        # The platform's buffers for paths are short, so the data path is, too.
+        self.work = tempfile.mkdtemp(prefix="titler-")
+        self.addCleanup(shutil.rmtree, self.work, ignore_errors=True)
+        self.environment = session.program_environment(
+            BUILD, K2SYS_AC_ROOT="", K2SYS_AC_DATA=os.path.join(self.work, "d"), K2SYS_LOG_DIR=self.keep,
+            K2SYS_PORT_OFFSET=OFFSET, **self.environment_changes)
+        self.display = None
+        self.appliance = None
+        self.titler = None
+        self.copied = False
+        self.base = self.provision()
+        self.display = session.Display(os.path.join(self.work, "x"), self.environment)
+        self.addCleanup(self.display.stop)
+        self.environment = self.display.environment
+        self.start_programs()
+
+    def provision(self):
+        done = subprocess.run([os.path.join(BUILD, "bin", "titler_provision")], env=self.environment, check=True,
+                              stdout=subprocess.PIPE, text=True)
+        return done.stdout.splitlines()[-1]
+
+    def start_programs(self):
+        self.appliance = session.Appliance(BUILD, os.path.join(self.keep, "appliance.log"), self.environment)
+        self.addCleanup(self.appliance.stop)
+        session.wait_listening(self.appliance, session.MAIN_PORT + OFFSET, 30 * SLOW)
+        session.wait_listening(self.appliance, session.SUB_PANEL_PORT + OFFSET, 30 * SLOW)
+        self.start_titler()
+
+    def start_titler(self):
+        self.titler = session.start_titler(BUILD, os.path.join(self.keep, "titler.log"), self.environment,
+                                           self.titler_arguments)
+        self.addCleanup(self.titler.stop)
+        session.wait_listening(self.titler, session.TITLER_PORT + OFFSET, 60 * SLOW)
+        self.command("wait-titler")
+
+    def tearDown(self):
+        outcome = self._outcome.result
+        failed = any(test is self for test, _ in outcome.errors + outcome.failures)
+        if not failed and sys.exc_info()[0] is None and self._outcome.success:
+            shutil.rmtree(self.keep, ignore_errors=True)
+        elif self.display:
+            self.display.screenshot(os.path.join(self.keep, "failed.png"))
+
+    def command(self, line):
+        """Gives the appliance a command and waits until it has been carried out."""
+        start = self.appliance.mark()
+        self.appliance.command(line)
+        done = self.appliance.wait_for(lambda event: event.get("command") == line and event["event"] != "call",
+                                       30 * SLOW, start, f"an answer to {line}")
+        self.assertEqual(done["event"], "ok", done)
+
+    # Data
+
+    def folder(self, name="Welcome"):
+        return os.path.join(self.base, "resources", "Titles", name)
+
+    def titles(self, folder):
+        """The title files of a folder in its order."""
+        order = xml.etree.ElementTree.parse(os.path.join(folder, ".order.xml")).getroot()
+        return [Title(os.path.join(folder, row.get("file-path"))) for row in order.iter("index")]
+
+    # The window
+
+    def window(self):
+        return self.display.find_window("Titler")
+
+    def wait_shown(self, timeout=20):
+        def shown():
+            self.titler.check()
+            return self.window()
+
+        window = session.wait_until(shown, timeout * SLOW, "the window")
+        self.display.wait_until_still(30 * SLOW)
+        return window
+
+    def wait_hidden(self, timeout=20):
+        def hidden():
+            self.titler.check()
+            return not self.window()
+
+        session.wait_until(hidden, timeout * SLOW, "the window to go")
+
+    def stays_shown(self, seconds=1.5):
+        """Whether the window is there all the time; for what must not happen there is nothing else to wait for."""
+        deadline = time.monotonic() + seconds * SLOW
+        while time.monotonic() < deadline:
+            self.titler.check()
+            if not self.window():
+                return False
+            time.sleep(0.05)
+        return True
+
+    def click(self, x, y, button=1):
+        """Clicks at a point of the window."""
+        left, top, _, _ = self.display.geometry(self.window())
+        self.display.click(left + x, top + y, button)
+
+    def click_tool(self, name):
+        self.click(*TOOL_POINTS[name])
+
+    def close_window(self):
+        start = self.appliance.mark()
+        self.click_tool("Close")
+        self.wait_closed(start)
+
+    def wait_closed(self, start):
+        """Waits until the window is gone and the last call of a session has come: all others are here with it."""
+        self.wait_hidden()
+        self.appliance.wait_for(
+            lambda event: event.get("method") == "setTopWindow" and event["args"]["topWindow"] == TOP_WINDOW_MAIN,
+            20 * SLOW, start, "the end of the session")
+
+    def choose_in_list_menu(self, row, entry):
+        """Opens the option menu of the title in this row by a right click and chooses an entry by keys."""
+        x, y = LIST_POINT
+        self.click(x, y + row * LIST_ROW, button=3)
+        self.display.wait_until_still()
+        # The keys step over entries that are disabled: without a copy there is nothing to paste.
+        entries = ["Create New", "Copy", "Paste", "Delete"] if self.copied else ["Create New", "Copy", "Delete"]
+        self.display.xdotool("key", "--delay", "60", *["Down"] * (entries.index(entry) + 1), "Return")
+        self.copied = self.copied or entry == "Copy"
+        self.display.wait_until_still()
+
+    def wait_titles(self, folder, count, timeout=20):
+        session.wait_until(lambda: len(self.titles(folder)) == count, timeout * SLOW, f"{count} titles in {folder}")
+
+    def calls(self, service, method, start=0):
+        """The arguments of the titler's calls of a service's method since start."""
+        return [event["args"] for event in self.appliance.since(start)
+                if (event.get("event"), event.get("service"), event.get("method")) == ("call", service, method)]
+
+    def wait_call(self, service, method, start, timeout=20):
+        """Waits for such a call and gives its arguments."""
+        return self.appliance.wait_event("call", timeout * SLOW, start, service=service, method=method)["args"]
+
+    def wait_keyboard(self, start):
+        """Waits until the titler has asked for the soft keyboard."""
+        self.wait_call("SoftKeyBoardController", "show", start)
+
+    def posted_messages(self, start):
+        return [call["messageId"] for call in self.calls("MessageCenter", "postMessage", start)]
+
+    def results(self, start):
+        """The results of create requests that the titler has sent back since start."""
+        return [event for event in self.appliance.since(start) if event.get("event") == "callback"]
+
+    def type_keys(self, text):
+        self.display.xdotool("type", "--clearmodifiers", "--delay", "40", text)
+
+    def screenshot(self, name="screen.png"):
+        path = os.path.join(self.keep, name)
+        self.display.screenshot(path)
+        return path
+
+    def open_title(self, title):
+        self.command(f'edit "{title.path}"')
+        return self.wait_shown()
+
+    def assert_canvas_shows(self, title, mean, visible):
+        """The canvas equals the title's on-air picture scaled down.
+
+        mean: mean difference in levels of 0 to 255; visible: share of pixels that are more than 32 levels off.
+        """
+        left, top, _, _ = self.display.geometry(self.window())
+        x, y, width, height = CANVAS
+        answer = pngdiff("screen", self.screenshot(), left + x, top + y, width, height, title.picture("_1920.png"),
+                         os.path.join(self.keep, "difference.png"))
+        self.assertLessEqual(answer["mean"], mean, answer)
+        self.assertLessEqual(answer["visible"], visible, answer)
+
+    def assert_pictures_have_their_sizes(self, title):
+        for suffix, (width, height) in PICTURES.items():
+            with self.subTest(picture=suffix):
+                self.assertEqual(pngdiff("size", title.picture(suffix)), {"width": width, "height": height})
+
+    def assert_no_leftovers(self, folder):
+        """Nothing but titles, their pictures and the order lies in the folder."""
+        known = {".order.xml"}
+        for title in self.titles(folder):
+            stem = os.path.basename(title.stem)
+            known.add(stem + ".xml")
+            known.update(stem + suffix for suffix in PICTURES)
+            known.update(stem + suffix for suffix in ("_source_1280.png", "_source_1920.png"))
+        self.assertEqual(set(os.listdir(folder)) - known, set())
+
+    def wait_text(self, title, wanted, timeout=20):
+        """Waits until the file holds a text object with this text."""
+        session.wait_until(lambda: wanted in title.texts(), timeout * SLOW, f"{wanted!r} in {title.path}")
+
+
+# The middle of each button of the tools bar, in pixels of the window.
+TOOL_POINTS = {"New Text": (810, 41), "Close": (1850, 41)}

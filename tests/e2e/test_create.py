@@ -1,0 +1,82 @@
+"""A sibling asks for new titles: the operator makes two in the list, closes, and the sibling is told their paths."""
+import os
+import unittest
+
+import harness
+
+FOLDER = "天气"
+CALL_TYPE = 7
+
+
+class CreateTitles(harness.TitlerTest):
+    def open_for_creation(self, folder):
+        """Asks for new titles; the folder that was open last stands for the operator's choice."""
+        self.open_title(self.titles(folder)[0])
+        self.close_window()
+        self.command("register")
+        self.command(f"create {CALL_TYPE}")
+        self.wait_shown()
+
+    def test_new_titles_come_back_in_the_order_of_the_folder(self):
+        folder = self.folder(FOLDER)
+        old = [title.path for title in self.titles(folder)]
+        self.open_for_creation(folder)
+        start = self.appliance.mark()
+        # The second is made above the first, so the folder's order is not the order of making.
+        for row in (1, 0):
+            count = len(self.titles(folder))
+            self.choose_in_list_menu(row, "Create New")
+            self.wait_titles(folder, count + 1)
+        self.close_window()
+
+        result = self.wait_result(start)
+        new = [title.path for title in self.titles(folder) if title.path not in old]
+        self.assertEqual(len(new), 2)
+        self.assertGreater(new[0], new[1], "the names tell the time of making")
+        self.assertEqual(result["type"], CALL_TYPE)
+        self.assertEqual(result["path"], folder)
+        self.assertEqual(result["paths"], new)
+        self.assertEqual(result["count"], 2)
+        self.assertEqual(result["size"], sum(self.packed_size(path) for path in new))
+        for path in new:
+            title = harness.Title(path)
+            self.assertTrue(os.path.exists(path))
+            self.assert_pictures_have_their_sizes(title)
+
+    def test_a_session_in_which_nothing_was_made_is_answered_too(self):
+        folder = self.folder(FOLDER)
+        self.open_for_creation(folder)
+        start = self.appliance.mark()
+        self.close_window()
+        result = self.wait_result(start)
+        self.assertEqual((result["type"], result["path"]), (CALL_TYPE, folder))
+        self.assertEqual((result["count"], result["size"], result["paths"]), (0, 0, []))
+
+    def test_a_title_that_was_deleted_again_is_not_named(self):
+        folder = self.folder(FOLDER)
+        old = [title.path for title in self.titles(folder)]
+        self.open_for_creation(folder)
+        start = self.appliance.mark()
+        self.choose_in_list_menu(1, "Create New")
+        self.wait_titles(folder, 3)
+        self.choose_in_list_menu(2, "Delete")
+        self.wait_titles(folder, 2)
+        self.close_window()
+        result = self.wait_result(start)
+        self.assertEqual(result["paths"], [])
+        self.assertEqual([title.path for title in self.titles(folder)], old)
+
+    def wait_result(self, start):
+        result = self.appliance.wait_event("callback", 20 * harness.SLOW, start)
+        self.assertEqual(result["method"], "finishTitlerCreateCallback")
+        return result
+
+    @staticmethod
+    def packed_size(path):
+        """A wide string on the wire: its header, its bytes and a NUL."""
+        length = len(path.encode()) + 1
+        return (1 if length < 32 else 3 if length < 65536 else 5) + length
+
+
+if __name__ == "__main__":
+    unittest.main()

@@ -1,0 +1,79 @@
+"""What a session does besides editing one title: the question on closing, requests that do not count, the sub panel."""
+import unittest
+
+import harness
+
+CONFIRM_CLOSE = 117
+ANSWER_OK = 2
+
+
+class ClosingQuestion(harness.TitlerTest):
+    def test_new_titles_of_an_edit_request_are_asked_about(self):
+        folder = self.folder()
+        self.open_title(self.titles(folder)[0])
+        self.choose_in_list_menu(0, "Copy")
+        self.choose_in_list_menu(0, "Paste")
+        self.wait_titles(folder, 5)
+
+        start = self.appliance.mark()
+        self.click_tool("Close")
+        message = self.wait_call("MessageCenter", "postMessage", start)
+        self.assertEqual(message["messageId"], CONFIRM_CLOSE)
+        self.assertTrue(self.stays_shown())
+        # The answer to another question is not the answer to this one.
+        self.command(f"message-close 110 {ANSWER_OK}")
+        self.assertTrue(self.stays_shown())
+        self.command(f"message-close {CONFIRM_CLOSE} {ANSWER_OK}")
+        self.wait_closed(start)
+        self.assertEqual(len(self.titles(folder)), 5)
+        self.assertEqual(self.results(start), [])
+
+        # The question was for that session only.
+        self.open_title(self.titles(folder)[0])
+        start = self.appliance.mark()
+        self.close_window()
+        self.assertEqual(self.posted_messages(start), [])
+
+
+class Requests(harness.TitlerTest):
+    def test_a_request_for_a_window_that_shows_is_dropped(self):
+        first, second = self.titles(self.folder())[:2]
+        self.open_title(first)
+        before = self.display.grab()
+        self.command(f'edit "{second.path}"')
+        # A later call on the same connection is handled after the dropped one.
+        self.command("dialog-mask 1")
+        harness.session.wait_until(lambda: self.display.grab() != before, 20 * harness.SLOW, "the mask")
+        self.command("dialog-mask 0")
+        harness.session.wait_until(lambda: self.display.grab() == before, 20 * harness.SLOW, "the first title again")
+        self.assert_canvas_shows(first, mean=1.5, visible=0.01)
+
+    def test_a_path_that_does_not_exist_shows_nothing(self):
+        self.command(f'edit "{self.folder("gone")}/gone.xml"')
+        first = self.titles(self.folder())[0]
+        self.open_title(first)
+        self.assert_canvas_shows(first, mean=1.5, visible=0.01)
+
+    def test_the_sub_panel_opens_the_window_and_gets_no_result(self):
+        self.open_title(self.titles(self.folder())[0])
+        self.close_window()
+        start = self.appliance.mark()
+        self.command("register")
+        self.command("sub")
+        self.wait_shown()
+        self.close_window()
+        self.assertEqual(self.results(start), [])
+        self.assertEqual(self.posted_messages(start), [])
+
+
+class RightScreen(harness.TitlerTest):
+    titler_arguments = ("-right",)
+
+    def test_the_window_lies_to_the_right(self):
+        self.command(f'edit "{self.titles(self.folder())[0].path}"')
+        self.wait_shown()
+        self.assertEqual(self.display.geometry(self.window()), (1280, 0, 1920, 1080))
+
+
+if __name__ == "__main__":
+    unittest.main()

@@ -1,0 +1,247 @@
+// A data path of its own with title folders, and recorders for what the title library reports.
+#pragma once
+
+#include "canvas/MessageBoxController.h"
+#include "document/Archive.h"
+#include "document/ArchiveController.h"
+#include "document/ArchiveOrder.h"
+#include "document/ITitleChangeReporter.h"
+#include "document/TText.h"
+#include "document/TextStyle.h"
+#include "library/IEditContext.h"
+#include "library/ITitlerFolderReporter.h"
+
+#include <QDir>
+#include <QFile>
+#include <QFileInfo>
+#include <QImage>
+#include <QMutex>
+#include <QMutexLocker>
+#include <QPair>
+#include <QStringList>
+#include <QTemporaryDir>
+#include <memory>
+#include <string>
+#include <vector>
+
+// Lives as long as the test program: the paths are read from the environment once.
+class LibraryFixture
+{
+public:
+    LibraryFixture()
+    {
+        qputenv("K2SYS_AC_ROOT", "");
+        qputenv("K2SYS_AC_DATA", mDir.path().toLocal8Bit());
+        const QString base = mDir.path() + QStringLiteral("/defaultuser/");
+        QDir().mkpath(base);
+        QFile paths(base + QStringLiteral("PathInfo.xml"));
+        if (paths.open(QIODevice::WriteOnly))
+            paths.write("<?xml version=\"1.0\"?><PathInfo><TitleResource path=\"titles\"/>"
+                        "<SystemSetting path=\"settings\"/><TitlerTemplate path=\"usertemplates\"/>"
+                        "<Template path=\"templates\"/><Font path=\"fonts\"/></PathInfo>");
+        QDir().mkpath(base + QStringLiteral("titles"));
+        QDir().mkpath(base + QStringLiteral("settings"));
+        QDir().mkpath(base + QStringLiteral("resources/Templates"));
+        checker().save(base + QStringLiteral("resources/Templates/checker_240x135.png"));
+    }
+
+    // What lies under the small pictures.
+    static QImage checker()
+    {
+        QImage image(240, 135, QImage::Format_RGB32);
+        for (int y = 0; y < image.height(); ++y) {
+            for (int x = 0; x < image.width(); ++x)
+                image.setPixelColor(x, y,
+                                    (x / 15 + y / 15) % 2 ? QColor(153, 153, 153) : QColor(102, 102, 102));
+        }
+        return image;
+    }
+
+    QString titleRoot() const { return mDir.path() + QStringLiteral("/defaultuser/titles"); }
+
+    QString makeFolder(const QString& name)
+    {
+        const QString path = titleRoot() + QLatin1Char('/') + name;
+        QDir(path).removeRecursively();
+        QDir().mkpath(path);
+        return path;
+    }
+
+    // One text object, styled character by character.
+    static TText* makeText(const QString& text, int id, float x = 100, float y = 100)
+    {
+        auto* record = new TText;
+        record->setTextObjectID(id);
+        record->setText(text.toStdString());
+        record->setXValue(x);
+        record->setYValue(y);
+        record->setZValue(1.0F);
+        std::vector<TextStyle*> styles;
+        for (const QChar c : text) {
+            auto* style = new TextStyle;
+            style->setText(QString(c).toStdString());
+            styles.push_back(style);
+        }
+        record->setTextItems(styles);
+        return record;
+    }
+
+    // The record of a title of this stem, with one text object that shows the text.
+    static std::unique_ptr<Archive> makeRecord(const QString& folder, const QString& stem,
+                                               const QString& text)
+    {
+        auto archive = std::make_unique<Archive>();
+        archive->setName(stem.toStdString());
+        archive->setPath((folder + QLatin1Char('/') + stem + QStringLiteral(".xml")).toStdString());
+        archive->setThumbnailBig((stem + QStringLiteral("_1920.png")).toStdString());
+        archive->setThumbnailMiddle((stem + QStringLiteral("_960.png")).toStdString());
+        archive->setThumbnailSmall((stem + QStringLiteral("_240.png")).toStdString());
+        archive->setThumbnailBlack((stem + QStringLiteral("_240S.png")).toStdString());
+        if (!text.isEmpty())
+            archive->setText({makeText(text, 1)});
+        return archive;
+    }
+
+    // Writes title files of these stems, each showing its stem as text, with small pictures and an order
+    // file.
+    static void fillFolder(const QString& folder, const QStringList& stems)
+    {
+        ArchiveController controller;
+        for (const QString& stem : stems) {
+            const auto archive = makeRecord(folder, stem, stem);
+            controller.saveNewArchive(folder, archive.get());
+            QImage small(240, 135, QImage::Format_ARGB32);
+            small.fill(Qt::red);
+            small.save(folder + QLatin1Char('/') + stem + QStringLiteral("_240.png"));
+        }
+        writeOrder(folder, stems);
+    }
+
+    static void writeOrder(const QString& folder, const QStringList& stems)
+    {
+        ArchiveController controller;
+        QList<ArchiveOrder*> rows;
+        for (const QString& stem : stems) {
+            auto* row = new ArchiveOrder;
+            row->setArchiveIndex(static_cast<int>(rows.size()));
+            if (!stem.isEmpty())
+                row->setArchivePath((stem + QStringLiteral(".xml")).toStdString());
+            rows.append(row);
+        }
+        controller.saveArchiveListOrder(folder, rows);
+        qDeleteAll(rows);
+    }
+
+    // Stems in the order file.
+    static QStringList order(const QString& folder)
+    {
+        ArchiveController controller;
+        QStringList stems;
+        for (ArchiveOrder* row : controller.getFileOrder(folder)) {
+            stems.append(QFileInfo(QString::fromStdString(row->getArchivePath())).completeBaseName());
+            delete row;
+        }
+        return stems;
+    }
+
+private:
+    QTemporaryDir mDir;
+};
+
+class TitleReportRecorder : public ITitleChangeReporter
+{
+public:
+    TitleReportRecorder() { setInstance(this); }
+    ~TitleReportRecorder() override { setInstance(nullptr); }
+
+    void changeTitlerStatus(FileManagerDefine::emTITLECHANGE_TYPE type, QString path) override
+    {
+        QMutexLocker lock(&mMutex);
+        mReports.append({static_cast<int>(type), QFileInfo(path).completeBaseName()});
+    }
+    QList<QPair<int, QString>> take()
+    {
+        QMutexLocker lock(&mMutex);
+        return std::exchange(mReports, {});
+    }
+
+private:
+    QMutex mMutex;
+    QList<QPair<int, QString>> mReports;
+};
+
+class EditContextRecorder : public IEditContext
+{
+public:
+    EditContextRecorder() { setInstance(this); }
+    ~EditContextRecorder() override { setInstance(nullptr); }
+
+    bool isCreateNew() override { return createNew; }
+    bool isNewCreateFile(std::wstring fileName) override
+    {
+        return files.contains(QString::fromStdWString(fileName));
+    }
+    void insertFilePath(std::wstring fileName) override { files.append(QString::fromStdWString(fileName)); }
+    void deleteFilePath(std::wstring fileName) override
+    {
+        files.removeAll(QString::fromStdWString(fileName));
+    }
+
+    bool createNew = false;
+    QStringList files;
+};
+
+class FolderReportRecorder : public ITitlerFolderReporter
+{
+public:
+    FolderReportRecorder() { setInstance(this); }
+    ~FolderReportRecorder() override { setInstance(nullptr); }
+
+    void editFolderStartStatus(QString folder) override { note(QStringLiteral("start"), folder); }
+    void editFolderEndStatus(QString folder) override { note(QStringLiteral("end"), folder); }
+    void updateTitlerOrder(QString folder) override { note(QStringLiteral("order"), folder); }
+
+    QStringList take() { return std::exchange(mReports, {}); }
+
+private:
+    void note(const QString& what, const QString& folder)
+    {
+        mReports.append(what + QLatin1Char(' ') + QFileInfo(folder).fileName());
+    }
+    QStringList mReports;
+};
+
+class MessageRecorder : public MessageBoxController
+{
+public:
+    MessageRecorder()
+    {
+        sRecorder = this;
+        setProvider([]() -> MessageBoxController* { return sRecorder; }, [] {});
+    }
+    ~MessageRecorder() override
+    {
+        sRecorder = nullptr;
+        setProvider(nullptr, nullptr);
+    }
+
+    void setFactory(TitlerToolFactory*) override {}
+    void postMessage(MessageDef::Message_ID id) override { mPosted.append({id, QString()}); }
+    void postMessage(MessageDef::Message_ID id, QString text) override { mPosted.append({id, text}); }
+    void postMessage(MessageDef::Message_ID id, MessageDefine::_emBoxType, QString text) override
+    {
+        mPosted.append({id, text});
+    }
+    void setMessageMainWindow(QWidget*) override {}
+    bool GetTitlerIsTop() override { return true; }
+    QMap<QString, QString> getMapData() override { return {}; }
+    void closeMessage(MessageDefine::_emCloseType) override {}
+
+    QList<QPair<int, QString>> take() { return std::exchange(mPosted, {}); }
+
+private:
+    inline static MessageRecorder* sRecorder = nullptr;
+    QList<QPair<int, QString>> mPosted;
+};
+
+using Reports = QList<QPair<int, QString>>;

@@ -1,0 +1,600 @@
+// The title list on folders: opening, selecting, the option menu, limits, saves that come back.
+#include "LibraryFixture.h"
+
+#include "library/ArchiveItem.h"
+#include "library/ArchiveList.h"
+#include "library/ArchiveMenu.h"
+
+#include <QGraphicsView>
+#include <QLabel>
+#include <QScrollBar>
+#include <QSignalSpy>
+#include <QTest>
+#include <QUndoStack>
+#include <QWheelEvent>
+
+class tst_ArchiveList : public QObject
+{
+    Q_OBJECT
+
+private slots:
+    void init();
+    void cleanup();
+    void opensAFolderInItsOrder();
+    void gapsAndBlankRows();
+    void opensAFileInAFolder();
+    void missingFileSelectsTheFirst();
+    void emptyAndMissingFolders();
+    void createRequestOffersATemplate();
+    void fullFolderRefusesNewTitles();
+    void fullDiskRefusesNewTitles();
+    void autoInitTakesTheLastFolder();
+    void autoInitFallsBackToTheFirstFolder();
+    void autoInitCanBeInterrupted();
+    void tapSelectsAndTellsTheCanvas();
+    void tapOnTheSelectedItemChangesNothing();
+    void dragScrollsAndSelectsNothing();
+    void longHoldOpensTheMenuAndSelectsNothing();
+    void menuOnEmptyArea();
+    void menuOnAnItem();
+    void wheelHidesTheMenu();
+    void saveRefreshesTheItem();
+    void textLinesOfOneAndOfManyObjects();
+    void itemStyles();
+    void cloneOfAnItem();
+    void followsARenamedFolder();
+    void changeOfFolderIsReported();
+    void synchronizationRemovesWhatTheOrderDoesNotName();
+    void cleaningForgetsTheFolder();
+    void selectionIsScrolledIntoView();
+    void moveModeIgnoresTaps();
+    void language();
+
+private:
+    ArchiveItem* item(int index) { return mList->getWidgetItem(index); }
+    QStringList stems() const
+    {
+        QStringList result;
+        for (int i = 0; i < mList->count(); ++i)
+            result.append(QFileInfo(mList->getWidgetItem(i)->getArchiveDataPath()).completeBaseName());
+        return result;
+    }
+    void tap(int index)
+    {
+        ArchiveItem* target = item(index);
+        QTest::mouseClick(target, Qt::LeftButton, Qt::NoModifier, QPoint(20, 20));
+    }
+    QMenu* menu() { return mList->findChild<ArchiveMenu*>(); }
+    QStringList enabledActions()
+    {
+        QStringList result;
+        for (const QAction* action : menu()->actions()) {
+            if (action->isEnabled())
+                result.append(action->text());
+        }
+        return result;
+    }
+    static QStringList numbered(int count)
+    {
+        QStringList result;
+        for (int i = 0; i < count; ++i)
+            result.append(QStringLiteral("t%1").arg(i, 2, 10, QLatin1Char('0')));
+        return result;
+    }
+    QString threeTitles(const QString& name)
+    {
+        const QString folder = mFixture.makeFolder(name);
+        LibraryFixture::fillFolder(folder, {QStringLiteral("c"), QStringLiteral("a"), QStringLiteral("b")});
+        return folder;
+    }
+
+    LibraryFixture mFixture;
+    EditContextRecorder mContext;
+    FolderReportRecorder mFolders;
+    MessageRecorder mMessages;
+    std::unique_ptr<QLabel> mLabel;
+    std::unique_ptr<ArchiveList> mList;
+    QUndoStack mStack;
+    QList<QString> mCanvas; // stems sent to the canvas; "null" for none
+};
+
+void tst_ArchiveList::init()
+{
+    mLabel = std::make_unique<QLabel>();
+    mList = std::make_unique<ArchiveList>(mLabel.get(), false);
+    mList->setFixedSize(549, 997);
+    connect(mList.get(), &ArchiveList::focusCommandSignal, &mStack, &QUndoStack::push);
+    connect(mList.get(), &ArchiveList::signalUpdateCanvas, this, [this](const Archive* archive) {
+        mCanvas.append(archive ? QString::fromStdString(archive->getName()) : QStringLiteral("null"));
+    });
+    mList->show();
+    QVERIFY(QTest::qWaitForWindowExposed(mList.get()));
+    mContext.createNew = false;
+    mFolders.take();
+    mMessages.take();
+    mCanvas.clear();
+}
+
+void tst_ArchiveList::cleanup()
+{
+    mStack.clear();
+    mList.reset();
+    qunsetenv("K2SYS_FS_REMAIN");
+}
+
+void tst_ArchiveList::opensAFolderInItsOrder()
+{
+    const QString folder = threeTitles(QStringLiteral("新闻 order"));
+    QCOMPARE(mLabel->text(), QStringLiteral("Folder"));
+    mList->refreshArchiveList(folder);
+    QCOMPARE(mList->getCurrentPath(), folder);
+    QCOMPARE(mLabel->text(), QStringLiteral("新闻 order"));
+    QCOMPARE(stems(), (QStringList{QStringLiteral("c"), QStringLiteral("a"), QStringLiteral("b")}));
+    QCOMPARE(mCanvas, (QStringList{QStringLiteral("c")}));
+    QCOMPARE(mList->getSelectedArchive(), item(0));
+    // The thumbnails follow by and by.
+    QTRY_VERIFY(item(2)->hasChildWidgets());
+    QCOMPARE(item(2)->textLines().front(), QStringLiteral("b"));
+    QCOMPARE(ArchiveController().getLastFolderPath(), folder);
+    QCOMPARE(ArchiveController().getLastArchivePath(), folder + QStringLiteral("/c.xml"));
+}
+
+void tst_ArchiveList::gapsAndBlankRows()
+{
+    const QString folder = threeTitles(QStringLiteral("gaps"));
+    QFile::remove(folder + QStringLiteral("/a.xml"));
+    LibraryFixture::writeOrder(folder,
+                               {QStringLiteral("c"), QStringLiteral("a"), QString(), QStringLiteral("b")});
+    mList->refreshArchiveList(folder);
+    QCOMPARE(stems(), (QStringList{QStringLiteral("c"), QString(), QStringLiteral("b")}));
+    QTRY_VERIFY(item(2)->hasChildWidgets());
+    tap(1); // a title without a file
+    QCOMPARE(mList->getSelectedArchive(), item(1));
+    mList->saveArchiveListOrder();
+    QCOMPARE(LibraryFixture::order(folder),
+             (QStringList{QStringLiteral("c"), QString(), QStringLiteral("b")}));
+}
+
+void tst_ArchiveList::opensAFileInAFolder()
+{
+    QSignalSpy picker(mList.get(), &ArchiveList::startTemplatePicker);
+    const QString folder = threeTitles(QStringLiteral("in file"));
+    mList->refreshArchiveListInFile(folder, QStringLiteral("b.xml"));
+    QCOMPARE(mList->getSelectedArchive(), item(2));
+    QCOMPARE(mCanvas, (QStringList{QStringLiteral("b")}));
+    QCOMPARE(picker.count(), 0);
+}
+
+void tst_ArchiveList::missingFileSelectsTheFirst()
+{
+    const QString folder = threeTitles(QStringLiteral("no file"));
+    mList->refreshArchiveListInFile(folder, QStringLiteral("z.xml"));
+    QCOMPARE(mList->getSelectedArchive(), item(0));
+    QCOMPARE(mCanvas, (QStringList{QStringLiteral("c")}));
+}
+
+void tst_ArchiveList::emptyAndMissingFolders()
+{
+    QSignalSpy picker(mList.get(), &ArchiveList::startTemplatePicker);
+    mList->refreshArchiveList(mFixture.makeFolder(QStringLiteral("empty")));
+    QCOMPARE(picker.count(), 1);
+    mList->refreshArchiveList(QStringLiteral("/nonexistent/folder"));
+    QCOMPARE(picker.count(), 2);
+    mList->refreshArchiveListInFile(mFixture.makeFolder(QStringLiteral("empty")), QStringLiteral("a.xml"));
+    QCOMPARE(picker.count(), 3);
+    QCOMPARE(mCanvas, (QStringList{QStringLiteral("null"), QStringLiteral("null"), QStringLiteral("null")}));
+    QVERIFY(mList->isEmpty());
+}
+
+void tst_ArchiveList::createRequestOffersATemplate()
+{
+    QSignalSpy picker(mList.get(), &ArchiveList::startTemplatePicker);
+    mContext.createNew = true;
+    const QString folder = threeTitles(QStringLiteral("create"));
+    mList->refreshArchiveList(folder);
+    QCOMPARE(picker.count(), 1);
+    QCOMPARE(mCanvas, (QStringList{QStringLiteral("null")}));
+    QVERIFY(!mList->getSelectedArchive());
+    mList->refreshArchiveListInFile(folder, QStringLiteral("a.xml"));
+    QCOMPARE(picker.count(), 2);
+    QCOMPARE(mList->getSelectedArchive(), item(1));
+}
+
+void tst_ArchiveList::fullFolderRefusesNewTitles()
+{
+    QSignalSpy picker(mList.get(), &ArchiveList::startTemplatePicker);
+    const QString folder = mFixture.makeFolder(QStringLiteral("full"));
+    LibraryFixture::fillFolder(folder, numbered(98));
+    mList->refreshArchiveList(folder);
+    QVERIFY(!mList->checkArchiveListIsFull()); // the 99th can be made
+    LibraryFixture::fillFolder(folder, numbered(99));
+    mContext.createNew = true;
+    mList->refreshArchiveList(folder);
+    QVERIFY(mList->checkArchiveListIsFull());
+    QCOMPARE(mMessages.take(), (Reports{{112, QStringLiteral("99")}}));
+    QCOMPARE(mCanvas.back(), QStringLiteral("t00"));
+    mList->refreshArchiveListInFile(folder, QStringLiteral("t05.xml"));
+    QCOMPARE(mMessages.take(), (Reports{{112, QStringLiteral("99")}}));
+
+    QTRY_VERIFY(item(0)->hasChildWidgets());
+    QTest::mouseClick(item(0), Qt::RightButton, Qt::NoModifier, QPoint(20, 20));
+    ArchiveMenu* options = mList->findChild<ArchiveMenu*>();
+    options->action(ArchiveAction::ACTION_CREATE)->trigger();
+    QCOMPARE(mMessages.take(), (Reports{{112, QStringLiteral("99")}}));
+    options->action(ArchiveAction::ACTION_COPY)->trigger();
+    QTest::mouseClick(item(0), Qt::RightButton, Qt::NoModifier, QPoint(20, 20));
+    options->action(ArchiveAction::ACTION_PASTE)->trigger();
+    QCOMPARE(mMessages.take(), (Reports{{113, QStringLiteral("99")}}));
+    QCOMPARE(picker.count(), 0);
+}
+
+void tst_ArchiveList::fullDiskRefusesNewTitles()
+{
+    QSignalSpy picker(mList.get(), &ArchiveList::startTemplatePicker);
+    mList->refreshArchiveList(threeTitles(QStringLiteral("disk")));
+    QTest::mouseClick(item(0), Qt::RightButton, Qt::NoModifier, QPoint(20, 20));
+    ArchiveMenu* options = mList->findChild<ArchiveMenu*>();
+    options->action(ArchiveAction::ACTION_COPY)->trigger();
+    QTest::mouseClick(item(0), Qt::RightButton, Qt::NoModifier, QPoint(20, 20));
+    qputenv("K2SYS_FS_REMAIN", "199999999");
+    QVERIFY(mList->checkDiskSpaceIsFull());
+    options->action(ArchiveAction::ACTION_CREATE)->trigger();
+    QCOMPARE(mMessages.take(), (Reports{{114, QStringLiteral("File")}}));
+    options->action(ArchiveAction::ACTION_PASTE)->trigger();
+    QCOMPARE(mMessages.take(), (Reports{{116, QString()}}));
+    QCOMPARE(picker.count(), 0);
+    qputenv("K2SYS_FS_REMAIN", "200000000");
+    QVERIFY(!mList->checkDiskSpaceIsFull());
+    options->action(ArchiveAction::ACTION_CREATE)->trigger();
+    QCOMPARE(picker.count(), 1);
+}
+
+void tst_ArchiveList::autoInitTakesTheLastFolder()
+{
+    const QString folder = threeTitles(QStringLiteral("last"));
+    ArchiveController().setLastFolderPath(folder);
+    QLabel label;
+    ArchiveList list(&label, true);
+    QTRY_COMPARE(list.count(), 3);
+    QCOMPARE(list.getCurrentPath(), folder);
+    QCOMPARE(label.text(), QStringLiteral("last"));
+    QCOMPARE(list.getSelectedArchive(), list.getWidgetItem(0));
+    QCOMPARE(mFolders.take(), (QStringList{QStringLiteral("start last")}));
+}
+
+void tst_ArchiveList::autoInitFallsBackToTheFirstFolder()
+{
+    threeTitles(QStringLiteral("first"));
+    const QString expected = QString::fromStdString(ArchiveController().getFolderList().front());
+    for (const QString& last : {QString(), QStringLiteral("/nonexistent")}) {
+        ArchiveController().setLastFolderPath(last);
+        QLabel label;
+        ArchiveList list(&label, true);
+        QCOMPARE(list.getCurrentPath(), expected);
+    }
+}
+
+void tst_ArchiveList::autoInitCanBeInterrupted()
+{
+    const QString many = mFixture.makeFolder(QStringLiteral("interrupted"));
+    LibraryFixture::fillFolder(many, numbered(40));
+    const QString folder = threeTitles(QStringLiteral("instead"));
+    QLabel label;
+    for (int i = 0; i < 10; ++i) {
+        ArchiveController().setLastFolderPath(many);
+        ArchiveList list(&label, true);
+        if (i % 2 == 0) // otherwise the list goes while its loader runs
+            list.refreshArchiveList(folder);
+        QCOMPARE(list.count(), i % 2 == 0 ? 3 : 0);
+    }
+}
+
+void tst_ArchiveList::tapSelectsAndTellsTheCanvas()
+{
+    mList->refreshArchiveList(threeTitles(QStringLiteral("tap")));
+    QSignalSpy leaving(mList.get(), &ArchiveList::itemSetDefaultState);
+    mCanvas.clear();
+    tap(2);
+    QCOMPARE(mCanvas, (QStringList{QStringLiteral("b")}));
+    QCOMPARE(leaving.count(), 1); // the title before gets its pictures
+    QCOMPARE(mStack.count(), 1);
+    QCOMPARE(item(2)->styleSheet(), ArchiveItem::UN_OPERATE_AND_SELECT_STATE);
+    QCOMPARE(item(0)->styleSheet(), ArchiveItem::UN_OPERATE_AND_UN_SELECT_STATE);
+    QVERIFY(item(2)->isSelected() && !item(0)->isSelected());
+}
+
+void tst_ArchiveList::tapOnTheSelectedItemChangesNothing()
+{
+    mList->refreshArchiveList(threeTitles(QStringLiteral("twice")));
+    mCanvas.clear();
+    mList->selectOperationArchive(0);
+    QCOMPARE(item(0)->styleSheet(), ArchiveItem::OPERATE_AND_SELECT_STATE);
+    tap(0);
+    QCOMPARE(item(0)->styleSheet(), ArchiveItem::UN_OPERATE_AND_SELECT_STATE); // but the border
+    QVERIFY(mCanvas.isEmpty());
+    QCOMPARE(mStack.count(), 0);
+}
+
+void tst_ArchiveList::dragScrollsAndSelectsNothing()
+{
+    const QString folder = mFixture.makeFolder(QStringLiteral("drag"));
+    LibraryFixture::fillFolder(folder, numbered(12));
+    mList->refreshArchiveList(folder);
+    mCanvas.clear();
+    QWidget* port = mList->viewport();
+    QTest::mousePress(port, Qt::LeftButton, Qt::NoModifier, QPoint(100, 700));
+    QTest::mouseMove(port, QPoint(100, 600));
+    QTest::mouseMove(port, QPoint(100, 500));
+    QTest::mouseRelease(port, Qt::LeftButton, Qt::NoModifier, QPoint(100, 500));
+    QCOMPARE(mList->verticalScrollBar()->value(), 200);
+    QVERIFY(mCanvas.isEmpty());
+}
+
+void tst_ArchiveList::longHoldOpensTheMenuAndSelectsNothing()
+{
+    mList->refreshArchiveList(threeTitles(QStringLiteral("hold")));
+    mCanvas.clear();
+    QSignalSpy shown(mList.get(), &ArchiveList::archiveListMenuShow);
+    QTest::mousePress(item(1), Qt::LeftButton, Qt::NoModifier, QPoint(20, 20));
+    QTRY_COMPARE(shown.count(), 1);
+    QVERIFY(mList->IsOptionMenuShowing());
+    QCOMPARE(item(1)->styleSheet(), ArchiveItem::OPERATE_AND_UN_SELECT_STATE);
+    QTest::mouseRelease(item(1), Qt::LeftButton, Qt::NoModifier, QPoint(20, 20));
+    QVERIFY(mCanvas.isEmpty());
+    mList->slotHideOptionMenu();
+    QVERIFY(!mList->IsOptionMenuShowing());
+    QCOMPARE(item(1)->styleSheet(), ArchiveItem::UN_OPERATE_AND_UN_SELECT_STATE);
+    tap(1);
+    QCOMPARE(mCanvas, (QStringList{QStringLiteral("a")}));
+
+    QTest::mousePress(item(2), Qt::LeftButton, Qt::NoModifier, QPoint(20, 20));
+    mList->stopArchiveListTapAndHoldTimer();
+    QTest::mouseRelease(item(2), Qt::LeftButton, Qt::NoModifier, QPoint(20, 20));
+    QCOMPARE(shown.count(), 1);
+}
+
+void tst_ArchiveList::menuOnEmptyArea()
+{
+    mList->refreshArchiveList(threeTitles(QStringLiteral("area")));
+    QTest::mouseClick(mList->viewport(), Qt::RightButton, Qt::NoModifier, QPoint(200, 900));
+    QCOMPARE(enabledActions(), (QStringList{QStringLiteral("Create New")}));
+    mList->slotHideOptionMenu();
+    QTest::mouseClick(item(0), Qt::RightButton, Qt::NoModifier, QPoint(20, 20));
+    mList->findChild<ArchiveMenu*>()->action(ArchiveAction::ACTION_COPY)->trigger();
+    mList->slotHideOptionMenu();
+    QTest::mouseClick(mList->viewport(), Qt::RightButton, Qt::NoModifier, QPoint(200, 900));
+    QCOMPARE(enabledActions(), (QStringList{QStringLiteral("Create New"), QStringLiteral("Paste")}));
+    mList->slotHideOptionMenu();
+    mList->clearCopyArchive();
+    QTest::mouseClick(mList->viewport(), Qt::RightButton, Qt::NoModifier, QPoint(200, 900));
+    QCOMPARE(enabledActions(), (QStringList{QStringLiteral("Create New")}));
+}
+
+void tst_ArchiveList::menuOnAnItem()
+{
+    mList->refreshArchiveList(threeTitles(QStringLiteral("on item")));
+    QTest::mouseClick(item(1), Qt::RightButton, Qt::NoModifier, QPoint(20, 20));
+    QCOMPARE(enabledActions(),
+             (QStringList{QStringLiteral("Create New"), QStringLiteral("Copy"), QStringLiteral("Delete")}));
+    QList<int> types;
+    for (QAction* action : menu()->actions())
+        types.append(qobject_cast<ArchiveAction*>(action)->getActionType());
+    QCOMPARE(types, (QList<int>{0, 1, 2, 3, 5}));
+    QCOMPARE(mList->getCurrentOperationArchive(), item(1));
+    mList->slotHideOptionMenu();
+    QTest::mouseClick(item(2), Qt::RightButton, Qt::NoModifier, QPoint(20, 20));
+    QCOMPARE(item(1)->styleSheet(), ArchiveItem::UN_OPERATE_AND_UN_SELECT_STATE);
+    QCOMPARE(item(2)->styleSheet(), ArchiveItem::OPERATE_AND_UN_SELECT_STATE);
+}
+
+void tst_ArchiveList::wheelHidesTheMenu()
+{
+    const QString folder = mFixture.makeFolder(QStringLiteral("wheel"));
+    LibraryFixture::fillFolder(folder, numbered(12));
+    mList->refreshArchiveList(folder);
+    QTest::mouseClick(item(1), Qt::RightButton, Qt::NoModifier, QPoint(20, 20));
+    QVERIFY(mList->IsOptionMenuShowing());
+    const auto wheel = [this](int delta) {
+        QWheelEvent event(QPointF(100, 100), mList->mapToGlobal(QPointF(100, 100)), QPoint(),
+                          QPoint(0, delta), Qt::NoButton, Qt::NoModifier, Qt::NoScrollPhase, false);
+        // An open popup keeps wheel events that are sent through the application to itself.
+        mList->wheelEvent(&event);
+    };
+    wheel(-120);
+    QVERIFY(!mList->IsOptionMenuShowing());
+    QCOMPARE(mList->firstVisibleItem(), 1);
+    wheel(120);
+    QCOMPARE(mList->firstVisibleItem(), 0);
+    wheel(120);
+    QCOMPARE(mList->firstVisibleItem(), 0);
+}
+
+void tst_ArchiveList::saveRefreshesTheItem()
+{
+    const QString folder = threeTitles(QStringLiteral("saved"));
+    mList->refreshArchiveList(folder);
+    QTRY_VERIFY(item(2)->hasChildWidgets());
+    const auto changed = LibraryFixture::makeRecord(folder, QStringLiteral("a"), QStringLiteral("速報"));
+    QVERIFY(ArchiveController().saveNewArchive(folder, changed.get()));
+    QImage picture(240, 135, QImage::Format_ARGB32_Premultiplied);
+    picture.fill(Qt::green);
+    mList->refreshBaseItem(folder + QStringLiteral("/a.xml"), picture);
+    QCOMPARE(item(1)->textLines().front(), QStringLiteral("速報"));
+    QCOMPARE(item(1)->getArchiveData()->getName(), std::string("a"));
+    const QImage shown = item(1)->grab().toImage();
+    QCOMPARE(shown.pixelColor(120, 70), QColor(Qt::green));
+    mList->refreshBaseItem(folder + QStringLiteral("/unknown.xml"), picture); // nobody's
+    mList->refreshBaseItem(QString(), QImage());
+}
+
+void tst_ArchiveList::textLinesOfOneAndOfManyObjects()
+{
+    Archive archive;
+    archive.setText({LibraryFixture::makeText(QStringLiteral("one\n two"), 1)});
+    ArchiveItem one(&archive, ArchiveItem::LIST_ITEM);
+    QVERIFY(one.textLines().isEmpty());
+    one.initArchiveItemChildWidget();
+    QCOMPARE(one.textLines(), (QStringList{QStringLiteral("one two"), QString(), QString(), QString()}));
+
+    archive.releaseVectorText();
+    archive.setText({LibraryFixture::makeText(QString(300, QLatin1Char('W')), 1)});
+    one.updateRightChild();
+    for (const QString& line : one.textLines()) {
+        QVERIFY(line.startsWith(QLatin1Char('W')));
+        QVERIFY(line.endsWith(QChar(0x2026)));
+    }
+
+    archive.releaseVectorText();
+    archive.setText({LibraryFixture::makeText(QStringLiteral("third"), 3),
+                     LibraryFixture::makeText(QStringLiteral("<b>first</b>"), 1),
+                     LibraryFixture::makeText(QStringLiteral("fifth"), 5),
+                     LibraryFixture::makeText(QStringLiteral("fourth"), 4),
+                     LibraryFixture::makeText(QStringLiteral("sec  ond"), 2)});
+    one.updateRightChild();
+    QCOMPARE(one.textLines(), (QStringList{QStringLiteral("<b>first</b>"), QStringLiteral("sec ond"),
+                                           QStringLiteral("third"), QStringLiteral("fourth")}));
+    archive.releaseVectorText();
+    one.updateRightChild();
+    QCOMPARE(one.textLines(), (QStringList{QString(), QString(), QString(), QString()}));
+}
+
+void tst_ArchiveList::itemStyles()
+{
+    Archive archive;
+    ArchiveItem shown(&archive, ArchiveItem::LIST_ITEM);
+    QCOMPARE(shown.size(), QSize(505, 139));
+    shown.initArchiveItemChildWidget();
+    const auto* view = shown.findChild<QGraphicsView*>();
+    QCOMPARE(view->geometry(), QRect(3, 2, 240, 135));
+    shown.setStyleSheet(ArchiveItem::OPERATE_AND_UN_SELECT_STATE);
+    QCOMPARE(shown.grab().toImage().pixelColor(250, 0), QColor(0, 186, 230));
+    shown.setStyleSheet(ArchiveItem::UN_OPERATE_AND_SELECT_STATE);
+    QVERIFY(shown.grab().toImage().pixelColor(246, 10).blue() > 150);
+    shown.setStyleSheet(ArchiveItem::UN_OPERATE_AND_UN_SELECT_STATE);
+    QCOMPARE(shown.grab().toImage().pixelColor(246, 10), QColor(51, 51, 51));
+
+    ArchiveItem narrow(&archive, ArchiveItem::NARROW_ITEM);
+    QCOMPARE(narrow.size(), QSize(254, 139));
+    narrow.initArchiveItemChildWidget();
+    QVERIFY(!narrow.findChild<QGraphicsView*>());
+}
+
+void tst_ArchiveList::cloneOfAnItem()
+{
+    auto archive =
+        LibraryFixture::makeRecord(QStringLiteral("/f"), QStringLiteral("t"), QStringLiteral("twin"));
+    auto original = std::make_unique<ArchiveItem>(archive.get(), ArchiveItem::LIST_ITEM);
+    original->setSelected(true);
+    const std::unique_ptr<ArchiveItem> clone(original->clone());
+    original.reset();
+    archive.reset();
+    QCOMPARE(clone->textLines().front(), QStringLiteral("twin"));
+    QCOMPARE(clone->styleSheet(), ArchiveItem::OPERATE_AND_SELECT_STATE);
+}
+
+void tst_ArchiveList::followsARenamedFolder()
+{
+    const QString before = threeTitles(QStringLiteral("before"));
+    mFixture.makeFolder(QStringLiteral("after"));
+    const QString after = mFixture.titleRoot() + QStringLiteral("/after");
+    mList->refreshArchiveList(before);
+    mList->selectArchive(1);
+    QDir().rmdir(after);
+    QVERIFY(QDir().rename(before, after));
+    mCanvas.clear();
+    mList->refreshArchiveListForChangeFolderName(QStringLiteral("/another"), after);
+    QCOMPARE(mList->getCurrentPath(), before);
+    QVERIFY(mCanvas.isEmpty());
+    mList->refreshArchiveListForChangeFolderName(before, after);
+    QCOMPARE(mList->getCurrentPath(), after);
+    QCOMPARE(mList->getSelectedArchive(), item(1));
+    QCOMPARE(mCanvas, (QStringList{QStringLiteral("a")}));
+    QCOMPARE(ArchiveController().getLastFolderPath(), after);
+}
+
+void tst_ArchiveList::changeOfFolderIsReported()
+{
+    const QString first = threeTitles(QStringLiteral("one"));
+    const QString second = threeTitles(QStringLiteral("two"));
+    mList->refreshArchiveList(first);
+    mList->refreshArchiveList(second);
+    QCOMPARE(mFolders.take(), (QStringList{QStringLiteral("start one"), QStringLiteral("end one"),
+                                           QStringLiteral("start two")}));
+}
+
+void tst_ArchiveList::synchronizationRemovesWhatTheOrderDoesNotName()
+{
+    mList->synchronizationFolderFile(); // no folder: nothing
+    const QString folder = threeTitles(QStringLiteral("sync"));
+    mList->refreshArchiveList(folder);
+    LibraryFixture::writeOrder(folder, {QStringLiteral("c"), QStringLiteral("b")});
+    mList->synchronizationFolderFile();
+    QVERIFY(!QFile::exists(folder + QStringLiteral("/a.xml")));
+    QVERIFY(!QFile::exists(folder + QStringLiteral("/a_240.png")));
+    QVERIFY(QFile::exists(folder + QStringLiteral("/b.xml")));
+}
+
+void tst_ArchiveList::cleaningForgetsTheFolder()
+{
+    mList->refreshArchiveList(threeTitles(QStringLiteral("clean")));
+    mList->cleanArchiveList();
+    QVERIFY(mList->isEmpty());
+    QVERIFY(mList->getCurrentPath().isEmpty());
+    QVERIFY(mLabel->text().isEmpty());
+    QVERIFY(!mList->getSelectedArchive());
+    QCoreApplication::processEvents(); // items whose thumbnails were still to come
+    QVERIFY(mList->findChildren<ArchiveItem*>().isEmpty());
+}
+
+void tst_ArchiveList::selectionIsScrolledIntoView()
+{
+    const QString folder = mFixture.makeFolder(QStringLiteral("scroll"));
+    LibraryFixture::fillFolder(folder, numbered(20));
+    mList->refreshArchiveList(folder);
+    mList->selectArchive(10);
+    QCOMPARE(mList->firstVisibleItem(), 4); // the selection stands in the 7th row
+    mList->selectArchive(1);
+    QCOMPARE(mList->firstVisibleItem(), 1);
+    mList->selectArchive(3);
+    QCOMPARE(mList->firstVisibleItem(), 1);
+
+    mList->setFixedSize(549, 300);
+    const QString six = mFixture.makeFolder(QStringLiteral("six"));
+    LibraryFixture::fillFolder(six, numbered(6));
+    mList->refreshArchiveList(six);
+    mList->selectArchive(5);
+    QCOMPARE(mList->firstVisibleItem(), 0);
+}
+
+void tst_ArchiveList::moveModeIgnoresTaps()
+{
+    mList->refreshArchiveList(threeTitles(QStringLiteral("move mode")));
+    QCOMPARE(mList->getMoveState(), 0);
+    QSignalSpy drag(mList.get(), &ArchiveList::signalItemsCanDrag);
+    mList->moveButtonClicked(true);
+    QCOMPARE(mList->getMoveState(), 1);
+    mCanvas.clear();
+    tap(1);
+    QTest::mouseClick(item(1), Qt::RightButton, Qt::NoModifier, QPoint(20, 20));
+    QVERIFY(mCanvas.isEmpty());
+    QVERIFY(!mList->IsOptionMenuShowing());
+    mList->moveButtonClicked(false);
+    QCOMPARE(mList->getMoveState(), 0);
+    QCOMPARE(drag.count(), 2);
+}
+
+void tst_ArchiveList::language()
+{
+    mList->refreshArchiveList(threeTitles(QStringLiteral("language")));
+    QTRY_VERIFY(item(2)->hasChildWidgets());
+    mList->translateText();
+    mList->setSystemLanFont(QStringLiteral("DFHeiW5-A"));
+    QCOMPARE(item(0)->findChild<QLabel*>()->font().family(), QStringLiteral("DFHeiW5-A"));
+    QCOMPARE(item(0)->findChild<QLabel*>()->font().pixelSize(), 28);
+    QTest::mouseClick(item(1), Qt::RightButton, Qt::NoModifier, QPoint(20, 20));
+    QCOMPARE(menu()->font().family(), QStringLiteral("DFHeiW5-A"));
+    mList->setSystemLanFont(QStringLiteral("KST"));
+}
+
+QTEST_MAIN(tst_ArchiveList)
+#include "tst_archivelist.moc"

@@ -1,0 +1,196 @@
+// The thread that writes a title's pictures: what it writes, when it counts as finished, what it drops.
+#include "LibraryFixture.h"
+
+#include "library/PictureThread.h"
+
+#include <QSemaphore>
+#include <QTest>
+
+namespace
+{
+
+// Holds the worker at the end of a job until the test lets it go on.
+class HoldingReporter : public ITitleChangeReporter
+{
+public:
+    HoldingReporter() { setInstance(this); }
+    ~HoldingReporter() override { setInstance(nullptr); }
+
+    void changeTitlerStatus(FileManagerDefine::emTITLECHANGE_TYPE, QString) override
+    {
+        reached.release();
+        goOn.acquire();
+    }
+
+    QSemaphore reached;
+    QSemaphore goOn;
+};
+
+QList<QImage> pictures(const QColor& colour)
+{
+    QImage big(1920, 1080, QImage::Format_ARGB32_Premultiplied);
+    big.fill(colour);
+    return {big, big.scaled(960, 540)};
+}
+
+// Tells when the last copy of it is gone.
+QImage watchedPicture(QSemaphore& gone)
+{
+    static uchar pixels[16 * 16 * 4] = {};
+    return QImage(
+        pixels, 16, 16, QImage::Format_ARGB32_Premultiplied,
+        [](void* info) { static_cast<QSemaphore*>(info)->release(); }, &gone);
+}
+
+} // namespace
+
+class tst_PictureThread : public QObject
+{
+    Q_OBJECT
+
+private slots:
+    void finishedStates();
+    void refusedJobs();
+    void filesAndSizes();
+    void transparentParts();
+    void jobQueuedAtTheEndIsNeverWritten();
+    void jobsAreWrittenInOrder();
+    void unwritableFolderIsPassedOver();
+    void namesThatLeaveTheFolderAreNotWritten();
+
+private:
+    LibraryFixture mFixture;
+};
+
+void tst_PictureThread::finishedStates()
+{
+    HoldingReporter reporter;
+    const auto archive = LibraryFixture::makeRecord(mFixture.makeFolder(QStringLiteral("states")),
+                                                    QStringLiteral("t"), QString());
+    PictureThread thread;
+    QVERIFY(thread.isThreadWaiting());
+    thread.addArchive(archive.get(), pictures(Qt::red));
+    QVERIFY(!thread.isThreadWaiting()); // from the moment it is queued
+    QVERIFY(reporter.reached.tryAcquire(1, 20000));
+    QVERIFY(!thread.isThreadWaiting());
+    reporter.goOn.release();
+    QTRY_VERIFY(thread.isThreadWaiting());
+}
+
+void tst_PictureThread::refusedJobs()
+{
+    const auto archive = LibraryFixture::makeRecord(mFixture.makeFolder(QStringLiteral("refused")),
+                                                    QStringLiteral("t"), QString());
+    PictureThread thread;
+    thread.addArchive(nullptr, pictures(Qt::red));
+    QVERIFY(thread.isThreadWaiting());
+    thread.addArchive(archive.get(), {});
+    thread.addArchive(archive.get(), {pictures(Qt::red).front()});
+    QVERIFY(thread.isThreadWaiting());
+}
+
+void tst_PictureThread::filesAndSizes()
+{
+    TitleReportRecorder reports;
+    const QString folder = mFixture.makeFolder(QStringLiteral("sizes"));
+    const auto archive = LibraryFixture::makeRecord(folder, QStringLiteral("t"), QString());
+    PictureThread thread;
+    thread.addArchive(archive.get(), pictures(QColor(10, 120, 230)));
+    QTRY_VERIFY(thread.isThreadWaiting());
+
+    QCOMPARE(QDir(folder).entryList(QDir::Files | QDir::Hidden, QDir::Name),
+             (QStringList{QStringLiteral("t_1920.png"), QStringLiteral("t_240.png"),
+                          QStringLiteral("t_240S.png"), QStringLiteral("t_960.png")}));
+    QCOMPARE(QImage(folder + QStringLiteral("/t_1920.png")).size(), QSize(1920, 1080));
+    QCOMPARE(QImage(folder + QStringLiteral("/t_960.png")).size(), QSize(960, 540));
+    QCOMPARE(QImage(folder + QStringLiteral("/t_240.png")).size(), QSize(240, 135));
+    QCOMPARE(QImage(folder + QStringLiteral("/t_240S.png")).size(), QSize(240, 135));
+    for (const char* name : {"/t_1920.png", "/t_960.png", "/t_240S.png"}) {
+        const QImage image(folder + QLatin1String(name));
+        QCOMPARE(image.pixelColor(image.width() / 2, image.height() / 2), QColor(10, 120, 230));
+    }
+    QCOMPARE(reports.take(), (Reports{{1, QStringLiteral("t")}}));
+}
+
+void tst_PictureThread::transparentParts()
+{
+    const QString folder = mFixture.makeFolder(QStringLiteral("transparent"));
+    const auto archive = LibraryFixture::makeRecord(folder, QStringLiteral("t"), QString());
+    PictureThread thread;
+    thread.addArchive(archive.get(), pictures(Qt::transparent));
+    QTRY_VERIFY(thread.isThreadWaiting());
+    QCOMPARE(QImage(folder + QStringLiteral("/t_1920.png")).pixelColor(3, 3).alpha(), 0);
+    QCOMPARE(QImage(folder + QStringLiteral("/t_960.png")).pixelColor(3, 3).alpha(), 0);
+    const QImage black(folder + QStringLiteral("/t_240S.png"));
+    QVERIFY(!black.hasAlphaChannel());
+    QCOMPARE(black.pixelColor(3, 3), QColor(Qt::black));
+    const QImage small = QImage(folder + QStringLiteral("/t_240.png")).convertToFormat(QImage::Format_RGB32);
+    QCOMPARE(small, LibraryFixture::checker());
+}
+
+void tst_PictureThread::jobQueuedAtTheEndIsNeverWritten()
+{
+    HoldingReporter reporter;
+    const QString folder = mFixture.makeFolder(QStringLiteral("dropped"));
+    const auto first = LibraryFixture::makeRecord(folder, QStringLiteral("first"), QString());
+    const auto second = LibraryFixture::makeRecord(folder, QStringLiteral("second"), QString());
+    auto thread = std::make_unique<PictureThread>();
+    thread->addArchive(first.get(), pictures(Qt::red));
+    QVERIFY(reporter.reached.tryAcquire(1, 20000));
+    QSemaphore dropped;
+    thread->addArchive(second.get(), {watchedPicture(dropped), pictures(Qt::red).back()});
+
+    std::unique_ptr<QThread> ending(QThread::create([&] { thread.reset(); }));
+    ending->start();
+    // The destructor drops the second job before it waits for the first one.
+    QVERIFY(dropped.tryAcquire(1, 20000));
+    reporter.goOn.release();
+    QVERIFY(ending->wait(20000));
+    QVERIFY(QFile::exists(folder + QStringLiteral("/first_1920.png")));
+    QVERIFY(!QFile::exists(folder + QStringLiteral("/second_1920.png")));
+    QCOMPARE(reporter.reached.available(), 0);
+}
+
+void tst_PictureThread::jobsAreWrittenInOrder()
+{
+    TitleReportRecorder reports;
+    const QString folder = mFixture.makeFolder(QStringLiteral("in order"));
+    PictureThread thread;
+    Reports expected;
+    for (int i = 0; i < 4; ++i) {
+        const QString stem = QStringLiteral("t%1").arg(i);
+        const auto archive = LibraryFixture::makeRecord(folder, stem, QString());
+        thread.addArchive(archive.get(), pictures(Qt::red));
+        expected.append({1, stem});
+    }
+    QTRY_VERIFY_WITH_TIMEOUT(thread.isThreadWaiting(), 30000);
+    QCOMPARE(reports.take(), expected);
+}
+
+void tst_PictureThread::unwritableFolderIsPassedOver()
+{
+    TitleReportRecorder reports;
+    const auto archive =
+        LibraryFixture::makeRecord(QStringLiteral("/nonexistent/folder"), QStringLiteral("t"), QString());
+    PictureThread thread;
+    thread.addArchive(archive.get(), pictures(Qt::red));
+    QTRY_VERIFY(thread.isThreadWaiting());
+    QCOMPARE(reports.take(), (Reports{{1, QStringLiteral("t")}}));
+}
+
+void tst_PictureThread::namesThatLeaveTheFolderAreNotWritten()
+{
+    const QString folder = mFixture.makeFolder(QStringLiteral("names"));
+    const auto archive = LibraryFixture::makeRecord(folder, QStringLiteral("t"), QString());
+    archive->setThumbnailBig("../stray.png");
+    archive->setThumbnailBlack("");
+    PictureThread thread;
+    thread.addArchive(archive.get(), pictures(Qt::red));
+    QTRY_VERIFY(thread.isThreadWaiting());
+    QVERIFY(!QFile::exists(mFixture.titleRoot() + QStringLiteral("/stray.png")));
+    QCOMPARE(QDir(folder).entryList(QDir::Files | QDir::Hidden, QDir::Name),
+             (QStringList{QStringLiteral("t_240.png"), QStringLiteral("t_960.png")}));
+}
+
+QTEST_GUILESS_MAIN(tst_PictureThread)
+#include "tst_picturethread.moc"

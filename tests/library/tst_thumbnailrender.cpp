@@ -1,0 +1,222 @@
+// The pictures of a title: sizes, places, transparency and when each stage runs.
+#include "LibraryFixture.h"
+
+#include "library/ThumbnailRender.h"
+
+#include <QSignalSpy>
+#include <QTest>
+
+namespace
+{
+
+// The rectangle of everything that is not the background.
+QRect inkIn(const QImage& image, const QColor& background = Qt::transparent)
+{
+    QRect ink;
+    for (int y = 0; y < image.height(); ++y) {
+        for (int x = 0; x < image.width(); ++x) {
+            if (image.pixelColor(x, y) != background)
+                ink |= QRect(x, y, 1, 1);
+        }
+    }
+    return ink;
+}
+
+} // namespace
+
+class tst_ThumbnailRender : public QObject
+{
+    Q_OBJECT
+
+private slots:
+    void nullDoesNothing();
+    void fastStageTouchesNoDisk();
+    void fastStageWithoutBackgroundIsTransparent();
+    void fastStageScalesTheBackground();
+    void missingBackgroundIsPassedOver();
+    void slowStageWritesFourFiles();
+    void slowStageRemovesTheOldBigPicture();
+    void textsStandAtOneAndAHalfTimesTheirPlace();
+    void textOutsideTheRasterIsHarmless();
+    void middlePictureIsTheBigOneReduced();
+    void manyRendersLeaveNothingBehind();
+
+private:
+    static QImage fastPicture(ThumbnailRender& render, const Archive& archive)
+    {
+        QImage picture;
+        const auto connection = connect(&render, &IThumbnailRender::saveHalfThumbnailsOK, &render,
+                                        [&picture](const QString&, const QImage& image) { picture = image; });
+        render.makeThumbnail(&archive, false);
+        disconnect(connection);
+        return picture;
+    }
+    QImage slowPicture(const Archive& archive, const char* suffix)
+    {
+        ThumbnailRender render;
+        render.makeThumbnail(&archive, true);
+        const bool finished = QTest::qWaitFor([&] { return render.makePictureThreadIsFinished(); }, 20000);
+        const QFileInfo title(QString::fromStdString(archive.getPath()));
+        return finished ? QImage(title.path() + QLatin1Char('/') + title.completeBaseName() +
+                                 QLatin1String(suffix))
+                        : QImage();
+    }
+    static void paint(const QString& path, QSize size, const QColor& colour)
+    {
+        QImage image(size, QImage::Format_RGB32);
+        image.fill(colour);
+        QVERIFY(image.save(path));
+    }
+
+    LibraryFixture mFixture;
+};
+
+void tst_ThumbnailRender::nullDoesNothing()
+{
+    ThumbnailRender render;
+    QSignalSpy spy(&render, &IThumbnailRender::saveHalfThumbnailsOK);
+    render.makeThumbnail(nullptr, true);
+    render.makeThumbnail(nullptr, false);
+    QCOMPARE(spy.count(), 0);
+    QVERIFY(render.makePictureThreadIsFinished());
+}
+
+void tst_ThumbnailRender::fastStageTouchesNoDisk()
+{
+    const QString folder = mFixture.makeFolder(QStringLiteral("fast"));
+    const auto archive = LibraryFixture::makeRecord(folder, QStringLiteral("t"), QStringLiteral("Fast"));
+    ThumbnailRender render;
+    QSignalSpy spy(&render, &IThumbnailRender::saveHalfThumbnailsOK);
+    render.makeThumbnail(archive.get(), false);
+    QCOMPARE(spy.count(), 1); // before the call returns
+    QCOMPARE(spy.front().at(0).toString(), QString::fromStdString(archive->getPath()));
+    QCOMPARE(spy.front().at(1).value<QImage>().size(), QSize(240, 135));
+    QVERIFY(render.makePictureThreadIsFinished());
+    QVERIFY(QDir(folder).entryList(QDir::Files | QDir::Hidden).isEmpty());
+}
+
+void tst_ThumbnailRender::fastStageWithoutBackgroundIsTransparent()
+{
+    const auto archive = LibraryFixture::makeRecord(mFixture.makeFolder(QStringLiteral("bare")),
+                                                    QStringLiteral("t"), QStringLiteral("Bare"));
+    ThumbnailRender render;
+    const QImage picture = fastPicture(render, *archive);
+    QVERIFY(!inkIn(picture).isEmpty());
+    QCOMPARE(picture.pixelColor(1, 133).alpha(), 0);
+    archive->releaseVectorText();
+    QVERIFY(inkIn(fastPicture(render, *archive)).isEmpty());
+}
+
+void tst_ThumbnailRender::fastStageScalesTheBackground()
+{
+    const QString folder = mFixture.makeFolder(QStringLiteral("background"));
+    const auto archive = LibraryFixture::makeRecord(folder, QStringLiteral("t"), QString());
+    archive->setBgResource("bg.png");
+    paint(folder + QStringLiteral("/bg.png"), QSize(100, 100), Qt::blue);
+    ThumbnailRender render;
+    const QImage picture = fastPicture(render, *archive);
+    QCOMPARE(picture.pixelColor(2, 2), QColor(Qt::blue));
+    QCOMPARE(picture.pixelColor(237, 132), QColor(Qt::blue));
+
+    archive->setBgPointX(640); // half of the canvas
+    const QImage moved = fastPicture(render, *archive);
+    QCOMPARE(moved.pixelColor(60, 60).alpha(), 0);
+    QCOMPARE(moved.pixelColor(180, 60), QColor(Qt::blue));
+}
+
+void tst_ThumbnailRender::missingBackgroundIsPassedOver()
+{
+    const QString folder = mFixture.makeFolder(QStringLiteral("missing"));
+    const auto archive = LibraryFixture::makeRecord(folder, QStringLiteral("t"), QString());
+    archive->setBgResource("nothing.png");
+    archive->setBgResourceBig("nothing.png");
+    QFile text(folder + QStringLiteral("/text.png"));
+    QVERIFY(text.open(QIODevice::WriteOnly));
+    text.write("no picture");
+    text.close();
+    ThumbnailRender render;
+    QVERIFY(inkIn(fastPicture(render, *archive)).isEmpty());
+    QVERIFY(inkIn(slowPicture(*archive, "_1920.png")).isEmpty());
+    archive->setBgResource("text.png");
+    QVERIFY(inkIn(fastPicture(render, *archive)).isEmpty());
+}
+
+void tst_ThumbnailRender::slowStageWritesFourFiles()
+{
+    TitleReportRecorder reports;
+    const QString folder = mFixture.makeFolder(QStringLiteral("slow"));
+    const auto archive = LibraryFixture::makeRecord(folder, QStringLiteral("t"), QStringLiteral("Slow"));
+    archive->setBgResource("bg.png");
+    archive->setBgResourceBig("bg.png");
+    paint(folder + QStringLiteral("/bg.png"), QSize(1920, 1080), QColor(20, 90, 40));
+    ThumbnailRender render;
+    QSignalSpy spy(&render, &IThumbnailRender::saveHalfThumbnailsOK);
+    render.makeThumbnail(archive.get(), true);
+    QTRY_VERIFY_WITH_TIMEOUT(render.makePictureThreadIsFinished(), 20000);
+    QCOMPARE(spy.count(), 0);
+    QCOMPARE(reports.take(), (Reports{{1, QStringLiteral("t")}}));
+    QCOMPARE(QImage(folder + QStringLiteral("/t_1920.png")).size(), QSize(1920, 1080));
+    QCOMPARE(QImage(folder + QStringLiteral("/t_960.png")).size(), QSize(960, 540));
+    for (const char* name : {"/t_240.png", "/t_240S.png"}) {
+        const QImage small(folder + QLatin1String(name));
+        QCOMPARE(small.size(), QSize(240, 135));
+        QCOMPARE(small.pixelColor(235, 130), QColor(20, 90, 40));
+    }
+}
+
+void tst_ThumbnailRender::slowStageRemovesTheOldBigPicture()
+{
+    const QString folder = mFixture.makeFolder(QStringLiteral("old"));
+    const auto archive = LibraryFixture::makeRecord(folder, QStringLiteral("t"), QString());
+    paint(folder + QStringLiteral("/t_1920.png"), QSize(10, 10), Qt::red);
+    QCOMPARE(slowPicture(*archive, "_1920.png").size(), QSize(1920, 1080));
+}
+
+void tst_ThumbnailRender::textsStandAtOneAndAHalfTimesTheirPlace()
+{
+    const QString folder = mFixture.makeFolder(QStringLiteral("places"));
+    const auto near = LibraryFixture::makeRecord(folder, QStringLiteral("near"), QString());
+    near->setText({LibraryFixture::makeText(QStringLiteral("Hg"), 1, 40, 60)});
+    const auto far = LibraryFixture::makeRecord(folder, QStringLiteral("far"), QString());
+    far->setText({LibraryFixture::makeText(QStringLiteral("Hg"), 1, 440, 260)});
+
+    const QRect nearInk = inkIn(slowPicture(*near, "_1920.png"));
+    const QRect farInk = inkIn(slowPicture(*far, "_1920.png"));
+    QVERIFY(!nearInk.isEmpty());
+    QCOMPARE(farInk.size(), nearInk.size());
+    QCOMPARE(farInk.topLeft() - nearInk.topLeft(), QPoint(600, 300));
+}
+
+void tst_ThumbnailRender::textOutsideTheRasterIsHarmless()
+{
+    const auto archive = LibraryFixture::makeRecord(mFixture.makeFolder(QStringLiteral("outside")),
+                                                    QStringLiteral("t"), QString());
+    archive->setText({LibraryFixture::makeText(QStringLiteral("far"), 1, 1e7F, -1e7F),
+                      LibraryFixture::makeText(QStringLiteral("nowhere"), 2, -50000, 50000)});
+    QVERIFY(inkIn(slowPicture(*archive, "_1920.png")).isEmpty());
+    ThumbnailRender render;
+    QVERIFY(inkIn(fastPicture(render, *archive)).isEmpty());
+}
+
+void tst_ThumbnailRender::middlePictureIsTheBigOneReduced()
+{
+    const auto archive = LibraryFixture::makeRecord(mFixture.makeFolder(QStringLiteral("middle")),
+                                                    QStringLiteral("t"), QStringLiteral("Half"));
+    const QRect big = inkIn(slowPicture(*archive, "_1920.png"));
+    const QRect middle = inkIn(slowPicture(*archive, "_960.png"));
+    QVERIFY(qAbs(big.left() / 2 - middle.left()) <= 2);
+    QVERIFY(qAbs(big.width() / 2 - middle.width()) <= 3);
+}
+
+void tst_ThumbnailRender::manyRendersLeaveNothingBehind()
+{
+    const auto archive = LibraryFixture::makeRecord(mFixture.makeFolder(QStringLiteral("many")),
+                                                    QStringLiteral("t"), QStringLiteral("Many"));
+    ThumbnailRender render;
+    const QImage first = fastPicture(render, *archive);
+    for (int i = 0; i < 20; ++i)
+        QCOMPARE(fastPicture(render, *archive), first);
+}
+
+QTEST_MAIN(tst_ThumbnailRender)
+#include "tst_thumbnailrender.moc"

@@ -1,0 +1,181 @@
+// Names and files of titles that are made from a template or from a copy.
+#include "LibraryFixture.h"
+
+#include "library/TitleFileOperations.h"
+#include "library/TitlerUtility.h"
+
+#include <QTest>
+
+class tst_TitleFileOperations : public QObject
+{
+    Q_OBJECT
+
+private slots:
+    void thumbnailNames();
+    void freeStemSkipsTakenNames();
+    void emptyFolderMakesNothing();
+    void presetKeepsItsBackground();
+    void ownBackgroundIsCopiedUnderNewNames();
+    void thumbnailWithoutExtensionSkipsTheBackground();
+    void copySurvivesItsSource();
+    void copyWithoutPicturesMakesTheTitleAlone();
+    void noFileIsLeftAside();
+
+private:
+    static void writeFile(const QString& path, const QByteArray& bytes)
+    {
+        QFile file(path);
+        QVERIFY(file.open(QIODevice::WriteOnly));
+        file.write(bytes);
+    }
+    static QByteArray readFile(const QString& path)
+    {
+        QFile file(path);
+        return file.open(QIODevice::ReadOnly) ? file.readAll() : QByteArray("missing");
+    }
+    static QString beside(const Archive& archive, const std::string& name)
+    {
+        return QString::fromStdString(TitlerUtility::getThumbnailPathFromTitlePath(archive.getPath(), name));
+    }
+
+    LibraryFixture mFixture;
+    ArchiveController mController;
+    TitleFileOperations mFiles{mController};
+};
+
+void tst_TitleFileOperations::thumbnailNames()
+{
+    QCOMPARE(TitlerUtility::getThumbnailNameFromTitlePath("/a/b/title.xml", "_960.png"), "title_960.png");
+    QCOMPARE(TitlerUtility::getThumbnailPathFromTitlePath("/a/b/title.xml", "x.png"), "/a/b/x.png");
+    QCOMPARE(TitlerUtility::getThumbnailPathFromTitlePath("title.xml", "x.png"), "./x.png");
+    QCOMPARE(TitlerUtility::getThumbnailNameFromTitlePath("/報/題.xml", "_1920.png"), "題_1920.png");
+}
+
+void tst_TitleFileOperations::freeStemSkipsTakenNames()
+{
+    const QString folder = mFixture.makeFolder(QStringLiteral("stems"));
+    const QDateTime now(QDate(2026, 1, 2), QTime(3, 4, 5, 998));
+    QCOMPARE(TitleFileOperations::freeStem(folder, now), QStringLiteral("20260102030405998"));
+    writeFile(folder + QStringLiteral("/20260102030405998.xml"), "x");
+    writeFile(folder + QStringLiteral("/20260102030405999.xml"), "x");
+    QCOMPARE(TitleFileOperations::freeStem(folder, now), QStringLiteral("20260102030406000"));
+}
+
+void tst_TitleFileOperations::emptyFolderMakesNothing()
+{
+    const Archive archive;
+    QVERIFY(!mFiles.createFromTemplate(QString(), archive));
+    QVERIFY(!mFiles.createFromCopy(QString(), archive, TitlePictures()));
+}
+
+void tst_TitleFileOperations::presetKeepsItsBackground()
+{
+    const QString templates = mFixture.makeFolder(QStringLiteral("preset source"));
+    const QString folder = mFixture.makeFolder(QStringLiteral("preset target"));
+    auto source = LibraryFixture::makeRecord(templates, QStringLiteral("p"), QStringLiteral("Preset"));
+    source->setBgResource((templates + QStringLiteral("/bg_1280.jpg")).toStdString());
+    source->setBgResourceBig((templates + QStringLiteral("/bg_1920.jpg")).toStdString());
+    for (const char* name : {"/p_1920.png", "/p_960.png", "/p_240.png", "/p_240S.png"})
+        writeFile(templates + QLatin1String(name), name);
+
+    const auto made = mFiles.createFromTemplate(folder, *source);
+    QVERIFY(made);
+    QCOMPARE(made->getBgResource(), source->getBgResource());
+    QCOMPARE(made->getBgResourceBig(), source->getBgResourceBig());
+    const std::string stem = made->getName();
+    QCOMPARE(stem.size(), std::size_t(17));
+    QCOMPARE(made->getPath(), folder.toStdString() + "/" + stem + ".xml");
+    QCOMPARE(made->getThumbnailSmall(), stem + "_240.png");
+    QCOMPARE(readFile(beside(*made, stem + "_1920.png")), QByteArray("/p_1920.png"));
+    QCOMPARE(readFile(beside(*made, stem + "_960.png")), QByteArray("/p_960.png"));
+    QCOMPARE(readFile(beside(*made, stem + "_240.png")), QByteArray("/p_240.png"));
+    QCOMPARE(readFile(beside(*made, stem + "_240S.png")), QByteArray("/p_240S.png"));
+
+    Archive loaded;
+    QVERIFY(mController.getOneArchive(QString::fromStdString(made->getPath()), &loaded));
+    QCOMPARE(loaded.text().size(), std::size_t(1));
+    QCOMPARE(loaded.text().front()->getText(), std::string("Preset"));
+}
+
+void tst_TitleFileOperations::ownBackgroundIsCopiedUnderNewNames()
+{
+    const QString templates = mFixture.makeFolder(QStringLiteral("own source"));
+    const QString folder = mFixture.makeFolder(QStringLiteral("own 目标"));
+    auto source = LibraryFixture::makeRecord(templates, QStringLiteral("t"), QStringLiteral("Own"));
+    source->setThumbnailSmall("t_240.jpe");
+    source->setBgResource("t_source_1280.jpe");
+    source->setBgResourceBig("t_source_1920.jpe");
+    for (const char* name : {"/t_240.jpe", "/t_source_1280.jpe", "/t_source_1920.jpe"})
+        writeFile(templates + QLatin1String(name), name);
+
+    const auto made = mFiles.createFromTemplate(folder, *source);
+    QVERIFY(made);
+    const std::string stem = made->getName();
+    QCOMPARE(made->getThumbnailSmall(), stem + "_240.jpe");
+    QCOMPARE(made->getBgResource(), stem + "_source_1280.jpe");
+    QCOMPARE(made->getBgResourceBig(), stem + "_source_1920.jpe");
+    QCOMPARE(readFile(beside(*made, made->getThumbnailSmall())), QByteArray("/t_240.jpe"));
+    QCOMPARE(readFile(made->getFullPathOfBgResource()), QByteArray("/t_source_1280.jpe"));
+    QCOMPARE(readFile(made->getFullPathOfBgResourceBig()), QByteArray("/t_source_1920.jpe"));
+}
+
+void tst_TitleFileOperations::thumbnailWithoutExtensionSkipsTheBackground()
+{
+    const QString folder = mFixture.makeFolder(QStringLiteral("no extension"));
+    auto source = LibraryFixture::makeRecord(folder, QStringLiteral("t"), QStringLiteral("T"));
+    source->setThumbnailSmall("thumbnail");
+    source->setBgResource("old.png");
+    const auto made = mFiles.createFromTemplate(folder, *source);
+    QVERIFY(made);
+    QCOMPARE(made->getThumbnailSmall(), made->getName() + "_240.png");
+    QCOMPARE(made->getBgResource(), std::string("old.png"));
+}
+
+void tst_TitleFileOperations::copySurvivesItsSource()
+{
+    const QString folder = mFixture.makeFolder(QStringLiteral("copy"));
+    const auto source = LibraryFixture::makeRecord(folder, QStringLiteral("s"), QStringLiteral("Copy me"));
+    for (const char* name : {"/s_1920.png", "/s_960.png", "/s_240.png", "/s_240S.png"})
+        writeFile(folder + QLatin1String(name), name);
+    LibraryFixture::fillFolder(folder, {QStringLiteral("other")});
+    QVERIFY(mController.saveNewArchive(folder, source.get()));
+    const TitlePictures pictures = TitleFileOperations::loadPictures(*source);
+    QVERIFY(mController.deleteArchive(QString::fromStdString(source->getPath())));
+    QVERIFY(!QFile::exists(folder + QStringLiteral("/s_1920.png")));
+
+    const auto first = mFiles.createFromCopy(folder, *source, pictures);
+    const auto second = mFiles.createFromCopy(folder, *source, pictures);
+    QVERIFY(first && second);
+    QVERIFY(first->getPath() != second->getPath());
+    for (const Archive* made : {first.get(), second.get()}) {
+        QCOMPARE(readFile(beside(*made, made->getThumbnailBig())), QByteArray("/s_1920.png"));
+        QCOMPARE(readFile(beside(*made, made->getThumbnailMiddle())), QByteArray("/s_960.png"));
+        QCOMPARE(readFile(beside(*made, made->getThumbnailSmall())), QByteArray("/s_240.png"));
+        QCOMPARE(readFile(beside(*made, made->getThumbnailBlack())), QByteArray("/s_240S.png"));
+        QVERIFY(QFile::exists(QString::fromStdString(made->getPath())));
+        QVERIFY(made->getBgResource().empty()); // a title without a background stays one
+    }
+}
+
+void tst_TitleFileOperations::copyWithoutPicturesMakesTheTitleAlone()
+{
+    const QString folder = mFixture.makeFolder(QStringLiteral("bare copy"));
+    const auto source = LibraryFixture::makeRecord(folder, QStringLiteral("s"), QStringLiteral("Bare"));
+    const TitlePictures pictures = TitleFileOperations::loadPictures(*source);
+    QVERIFY(pictures.big.isEmpty() && pictures.small.isEmpty());
+    QVERIFY(mFiles.createFromCopy(folder, *source, pictures));
+    QCOMPARE(QDir(folder).entryList(QDir::Files).size(), 1);
+}
+
+void tst_TitleFileOperations::noFileIsLeftAside()
+{
+    const QString folder = mFixture.makeFolder(QStringLiteral("aside"));
+    const auto source = LibraryFixture::makeRecord(folder, QStringLiteral("s"), QStringLiteral("A"));
+    TitlePictures pictures;
+    pictures.big = pictures.middle = pictures.black = pictures.small = QByteArray("picture");
+    QVERIFY(mFiles.createFromCopy(folder, *source, pictures));
+    QCOMPARE(QDir(folder).entryList(QDir::Files | QDir::Hidden).size(), 5);
+}
+
+QTEST_GUILESS_MAIN(tst_TitleFileOperations)
+#include "tst_titlefileoperations.moc"

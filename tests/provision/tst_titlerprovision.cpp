@@ -1,0 +1,246 @@
+#include "appliance/SampleBackgrounds.h"
+#include "appliance/SampleTitles.h"
+#include "appliance/TitlerProvision.h"
+#include "document/Archive.h"
+#include "document/TText.h"
+#include "document/TitleParser.h"
+
+#include <QDirIterator>
+#include <QFile>
+#include <QFileInfo>
+#include <QImage>
+#include <QTemporaryDir>
+#include <QTest>
+#include <QXmlStreamReader>
+#include <memory>
+
+namespace
+{
+
+QByteArray contents(const QString& path)
+{
+    QFile file(path);
+    return file.open(QIODevice::ReadOnly) ? file.readAll() : QByteArray();
+}
+
+QMap<QString, QByteArray> tree(const QString& root)
+{
+    QMap<QString, QByteArray> files;
+    QDirIterator walk(root, QDir::Files | QDir::Hidden, QDirIterator::Subdirectories);
+    while (walk.hasNext()) {
+        const QString path = walk.next();
+        files.insert(path.mid(root.size()), contents(path));
+    }
+    return files;
+}
+
+std::vector<std::unique_ptr<Archive>> titlesOf(const QString& folder)
+{
+    std::vector<std::unique_ptr<Archive>> titles;
+    for (Archive* archive : TitleParser().getFilsByOrderInFolder(folder.toStdString())) {
+        titles.emplace_back(archive);
+    }
+    return titles;
+}
+
+// Makes the folder the data path of the process and gives its base path.
+QString useDataPath(const QTemporaryDir& dir)
+{
+    qputenv("K2SYS_AC_DATA", dir.path().toLocal8Bit());
+    return TitlerProvision::basePathOfEnvironment();
+}
+
+} // namespace
+
+class tst_titlerprovision : public QObject
+{
+    Q_OBJECT
+
+private slots:
+    void initTestCase();
+    void thePathFileHasEveryNode();
+    void checkersHaveTwoShades();
+    void sampleTitlesAreWhole();
+    void samplesShowFourScriptsAnOutlineAndAShadow();
+    void templatesAreReadInBothLanguages();
+    void aSecondRunKeepsWhatTheUserMade();
+    void itIsTheSameEveryTime();
+    void anInterruptedRunIsMadeGood();
+    void aPathThatCannotBeMadeIsReported();
+
+private:
+    QTemporaryDir mDir;
+    QString mBase;
+};
+
+void tst_titlerprovision::initTestCase()
+{
+    QVERIFY(mDir.isValid());
+    mBase = useDataPath(mDir);
+    QCOMPARE(mBase, mDir.path() + "/defaultuser/");
+    TitlerProvision provision(mBase);
+    QVERIFY2(provision.writeMissing(), qPrintable(provision.error()));
+    for (const QString& path : tree(mBase).keys()) {
+        QVERIFY2(!path.contains(".making"), qPrintable(path));
+    }
+}
+
+void tst_titlerprovision::thePathFileHasEveryNode()
+{
+    QFile file(mBase + "PathInfo.xml");
+    QVERIFY(file.open(QIODevice::ReadOnly));
+    QXmlStreamReader xml(&file);
+    QMap<QString, QString> paths;
+    QVERIFY(xml.readNextStartElement());
+    while (xml.readNextStartElement()) {
+        paths.insert(xml.name().toString(), xml.attributes().value("path").toString());
+        xml.skipCurrentElement();
+    }
+    QVERIFY(!xml.hasError());
+    for (const char* node : {"Titler",        "Project",    "Projects",      "Template",
+                             "CurrentStatus", "StreamKey",  "SystemSetting", "TitlerTemplate",
+                             "Movie",         "TitleImage", "TitleResource", "Audio",
+                             "Font",          "VOD",        "MXF",           "Logo",
+                             "Title",         "tmp",        "Resource",      "Data"}) {
+        QVERIFY2(!paths.value(node).isEmpty(), node);
+        QVERIFY2(!paths.value(node).startsWith('/'), node);
+    }
+    QCOMPARE(paths.value("TitleResource"), QString("resources/Titles"));
+}
+
+void tst_titlerprovision::checkersHaveTwoShades()
+{
+    for (const QSize& size : {QSize(240, 135), QSize(135, 135)}) {
+        const QImage checker(
+            mBase + QString("resources/Templates/checker_%1x%2.png").arg(size.width()).arg(size.height()));
+        QCOMPARE(checker.size(), size);
+        QVERIFY(checker.pixel(0, 0) != checker.pixel(15, 0));
+        QCOMPARE(checker.pixel(0, 0), checker.pixel(15, 15));
+    }
+}
+
+void tst_titlerprovision::sampleTitlesAreWhole()
+{
+    const auto titles = titlesOf(mBase + "resources/Titles/Welcome");
+    QCOMPARE(titles.size(), std::size_t(4));
+    QCOMPARE(titlesOf(mBase + QString::fromUtf8("resources/Titles/天气")).size(), std::size_t(2));
+    for (const auto& title : titles) {
+        const QString folder = QFileInfo(QString::fromStdString(title->getPath())).path() + '/';
+        const auto picture = [&folder](const std::string& name) {
+            return QImage(folder + QString::fromStdString(name));
+        };
+        QCOMPARE(picture(title->getThumbnailBig()).size(), QSize(1920, 1080));
+        QCOMPARE(picture(title->getThumbnailMiddle()).size(), QSize(960, 540));
+        QCOMPARE(picture(title->getThumbnailSmall()).size(), QSize(240, 135));
+        QCOMPARE(picture(title->getThumbnailBlack()).size(), QSize(240, 135));
+        if (!title->getBgResource().empty()) {
+            QVERIFY(!title->isPreset());
+            QCOMPARE(picture(title->getBgResource()).size(), QSize(1280, 720));
+            QCOMPARE(picture(title->getBgResourceBig()).size(), QSize(1920, 1080));
+        }
+    }
+}
+
+void tst_titlerprovision::samplesShowFourScriptsAnOutlineAndAShadow()
+{
+    const auto titles = titlesOf(mBase + "resources/Titles/Welcome");
+    QStringList families;
+    for (const TText* text : titles.at(1)->text()) {
+        families << QString::fromStdString(text->textItems().at(0)->getFontFamily());
+        QCOMPARE(text->textItems().size(), std::size_t(QString::fromStdString(text->getText()).size()));
+    }
+    QCOMPARE(families, QStringList({"KST", "DFHeiW5-A", "KST Japanese Pro", "YDGothic 100 Pro"}));
+    const auto& first = titles.at(0)->text();
+    QCOMPARE(first.size(), std::size_t(2));
+    QVERIFY(first.at(0)->textItems().at(0)->isTextEdge() != 0);
+    QVERIFY(first.at(1)->getShadowStyle() != 0);
+    QCOMPARE(first.at(1)->getText(), std::string("晚间新闻"));
+
+    // The text is in the picture: it differs from the background where the text stands.
+    const QString folder = mBase + "resources/Titles/Welcome/";
+    const QImage shown(folder + QString::fromStdString(titles.at(0)->getThumbnailBig()));
+    const QImage background(folder + QString::fromStdString(titles.at(0)->getBgResourceBig()));
+    const QRect text(30, 780, 1000, 280);
+    const QRect sky(30, 30, 1000, 280);
+    QVERIFY(shown.convertToFormat(QImage::Format_RGB32).copy(text) !=
+            background.convertToFormat(QImage::Format_RGB32).copy(text));
+    QCOMPARE(shown.convertToFormat(QImage::Format_RGB32).copy(sky),
+             background.convertToFormat(QImage::Format_RGB32).copy(sky));
+}
+
+void tst_titlerprovision::templatesAreReadInBothLanguages()
+{
+    for (const char* set : {"templates_en", "templates_chs"}) {
+        const auto templates = titlesOf(mBase + "resources/Templates/" + set);
+        QCOMPARE(templates.size(), std::size_t(3));
+        for (const auto& preset : templates) {
+            QVERIFY(preset->isPreset());
+            QCOMPARE(QImage(preset->getFullPathOfBgResource()).size(), QSize(1280, 720));
+            QCOMPARE(QImage(preset->getFullPathOfThumbnailSmall()).size(), QSize(240, 135));
+        }
+    }
+}
+
+void tst_titlerprovision::aSecondRunKeepsWhatTheUserMade()
+{
+    QTemporaryDir dir;
+    const QString base = useDataPath(dir);
+    QVERIFY(TitlerProvision(base).writeMissing());
+    const QString folder = base + "resources/Titles/Welcome/";
+    QFile changed(folder + "20240101090000001.xml");
+    QVERIFY(changed.open(QIODevice::WriteOnly));
+    changed.write("<mine/>");
+    changed.close();
+    QVERIFY(QFile::remove(folder + "20240101090000002.xml"));
+    QVERIFY(QDir(base + QString::fromUtf8("resources/Titles/天气")).removeRecursively());
+    QVERIFY(QFile::remove(base + "resources/Templates/checker_240x135.png"));
+    QMap<QString, QByteArray> expected = tree(base);
+
+    QVERIFY(TitlerProvision(base).writeMissing());
+    QVERIFY(QFileInfo::exists(base + "resources/Templates/checker_240x135.png"));
+    QMap<QString, QByteArray> after = tree(base);
+    after.remove("resources/Templates/checker_240x135.png");
+    QCOMPARE(after, expected);
+}
+
+void tst_titlerprovision::itIsTheSameEveryTime()
+{
+    QTemporaryDir dir;
+    const QString base = useDataPath(dir);
+    QVERIFY(TitlerProvision(base).writeMissing());
+    const QMap<QString, QByteArray> other = tree(base);
+    const QMap<QString, QByteArray> first = tree(mBase);
+    QCOMPARE(other.keys(), first.keys());
+    for (auto file = first.cbegin(); file != first.cend(); ++file) {
+        if (file.key().endsWith(".png")) {
+            QVERIFY2(other.value(file.key()) == file.value(), qPrintable(file.key()));
+        }
+    }
+}
+
+void tst_titlerprovision::anInterruptedRunIsMadeGood()
+{
+    QTemporaryDir dir;
+    const QString base = useDataPath(dir);
+    QVERIFY(QDir().mkpath(base + "resources/Titles.making/Welcome.making"));
+    QFile torn(base + "resources/Titles.making/Welcome.making/20240101090000001.xml");
+    QVERIFY(torn.open(QIODevice::WriteOnly));
+    torn.write("<manifest");
+    torn.close();
+    QVERIFY(TitlerProvision(base).writeMissing());
+    QVERIFY(!QFileInfo::exists(base + "resources/Titles.making"));
+    QCOMPARE(titlesOf(base + "resources/Titles/Welcome").size(), std::size_t(4));
+}
+
+void tst_titlerprovision::aPathThatCannotBeMadeIsReported()
+{
+    QTemporaryDir dir;
+    QFile file(dir.path() + "/defaultuser");
+    QVERIFY(file.open(QIODevice::WriteOnly));
+    TitlerProvision provision(dir.path() + "/defaultuser/");
+    QVERIFY(!provision.writeMissing());
+    QVERIFY(provision.error().contains("defaultuser"));
+}
+
+QTEST_MAIN(tst_titlerprovision)
+#include "tst_titlerprovision.moc"

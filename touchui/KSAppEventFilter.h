@@ -1,0 +1,100 @@
+#pragma once
+
+#include "touchui/KSLockObject.h"
+
+#include <QList>
+#include <QMap>
+#include <QObject>
+
+// The application-wide gate that decides which object may receive a touch: it is installed on the application
+// object and sees every event first. One object at a time holds the default lock; a touch on any other is
+// swallowed, and so are its updates and its end. Window-level events, which come before those of the widget,
+// pass untouched, except key presses. GUI thread only.
+class KSAppEventFilter : public QObject
+{
+    Q_OBJECT
+public:
+    explicit KSAppEventFilter(QObject* parent = nullptr);
+    // Deletes every lock object that was created here or given to keepNewLockObject.
+    ~KSAppEventFilter() override;
+
+    bool eventFilter(QObject* obj, QEvent* event) override;
+
+    // Makes a lock of the type (or uses the given one) and makes the objects eligible for it. Null on
+    // refusal. The result is owned here, also a given one.
+    virtual KSLockObject* createLockObject(QObject* obj, KSLockObject* lock, LOCKOBJECT_TYPE type,
+                                           void* param);
+    virtual KSLockObject* createLockObject(QList<QObject*> objs, KSLockObject* lock, LOCKOBJECT_TYPE type,
+                                           void* param);
+    // The same, and lets touches ask for it from now on.
+    virtual KSLockObject* registerLockObject(QObject* obj, KSLockObject* lock, LOCKOBJECT_TYPE type,
+                                             void* param);
+    virtual KSLockObject* registerLockObject(QList<QObject*> objs, KSLockObject* lock, LOCKOBJECT_TYPE type,
+                                             void* param);
+    virtual int unregisterLockObject(QObject* obj, KSLockObject* lock);
+
+    // The object's eventFilter() is asked for every widget event that passes the gate, in the order of
+    // registration. A deleted object leaves by itself.
+    virtual void registerEventFilter(QObject* obj);
+    virtual void unegisterEventFilter(QObject* obj);
+
+    virtual bool doEventFilter(QObject* obj, QEvent* event);
+    // 0 lets the event pass, 1 swallows it; likewise the next three.
+    virtual int doLock(QObject* obj, QEvent* event);
+    virtual int doLockTouchBegin(QObject* obj, QEvent* event);
+    virtual int doLockTouchUpdate(QObject* obj, QEvent* event);
+    virtual int doLockTouchEnd(QObject* obj, QEvent* event);
+
+    // 0: accepted; 1: refused.
+    virtual int tryLock(QObject* obj, LOCKMETHOD_TYPE method);
+    virtual int tryUnlock(QObject* obj, LOCKMETHOD_TYPE method);
+    // Whether any lock is active; the arguments are not looked at.
+    virtual bool isLock(QObject* obj, LOCKMETHOD_TYPE method);
+    virtual LOCKMETHOD_TYPE getLockMethod(QEvent* event);
+
+    virtual KSLockObject* preCreateLockObject(QObject* obj, KSLockObject* lock, LOCKOBJECT_TYPE type,
+                                              void* param);
+    virtual KSLockObject* preCreateLockObject(QList<QObject*> objs, KSLockObject* lock, LOCKOBJECT_TYPE type,
+                                              void* param);
+    virtual int initLockObject(QObject* obj, KSLockObject* lock, LOCKOBJECT_TYPE type, void* param);
+    virtual int initLockObject(QList<QObject*> objs, KSLockObject* lock, LOCKOBJECT_TYPE type, void* param);
+    virtual void addRegLockObject(QObject* obj, KSLockObject* lock, LOCKOBJECT_TYPE type, void* param);
+    virtual void addRegLockObject(QList<QObject*> objs, KSLockObject* lock, LOCKOBJECT_TYPE type,
+                                  void* param);
+    virtual void removeRegLockObject(KSLockObject* lock);
+    virtual void notifyRegLockObjects(QObject* obj, KSLockObject* sender, LOCK_MESSAGE message, void* param,
+                                      LOCK_NOTIFY_FLAGS flags);
+    virtual void deleteLockObject(KSLockObject* lock);
+
+    virtual void addActivateLockObject(QObject* obj, KSLockObject* lock, LOCKMETHOD_TYPE method);
+    virtual void removeActivateLockObject(QObject* obj, KSLockObject* lock, LOCKMETHOD_TYPE method);
+    virtual void clearActivateLockObject();
+    // The locks that are held now, each with its holders; a forced lock has none.
+    virtual QMap<KSLockObject*, QList<QObject*>> activateLockObjects();
+    // Takes ownership; null is ignored, and so is a lock that is owned already.
+    virtual void keepNewLockObject(KSLockObject* lock);
+
+    virtual bool notifyRegEventFilter(QObject* obj, QEvent* event);
+    // False for a disabled widget.
+    virtual bool isEnable(QObject* obj);
+
+    // Breaks every lock and puts this one in their place.
+    void lock(KSLockObject* lockObject);
+    void unlock();
+    // unlock(), and every lock object hears of it.
+    void resetLock();
+    // Sends a key press to the soft keyboard while that is open. True when it was sent.
+    bool onKeyPress(QObject* obj, QEvent* event);
+
+Q_SIGNALS:
+    // A press or touch has begun somewhere in this process.
+    void signalEventBegin();
+
+private:
+    static int priorityOf(LOCKOBJECT_TYPE type);
+
+    QMap<int, QList<KSLockObject*>> m_registered; // by priority; 6 is asked first
+    QMap<KSLockObject*, QList<QObject*>> m_active;
+    QList<KSLockObject*> m_owned;
+    QList<QObject*> m_eventFilters;
+};

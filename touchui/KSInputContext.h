@@ -1,0 +1,152 @@
+// The input context of the application: the fields of this program are filled by a soft keyboard that lives
+// in another process of the appliance.
+#pragma once
+
+#include "messaging/services/ISoftKeyBoardController.h"
+#include "messaging/services/ISoftKeyBoardControllerCallBack.h"
+#include "messaging/services/SubCommonDefine.h"
+
+#include <QEvent>
+#include <QPointer>
+#include <QString>
+#include <QWidget>
+#include <qpa/qplatforminputcontext.h>
+
+#include <memory>
+#include <string>
+
+class QComboBox;
+class QGraphicsTextItem;
+class QGraphicsView;
+class QInputMethodEvent;
+class QLineEdit;
+
+// Describes the focused field to the soft keyboard service, and applies the strings, keys and cursor
+// positions that the service sends back. The field is a QLineEdit, an editable QComboBox or a text item of a
+// QGraphicsView.
+//
+// Qt makes and owns the one instance: install() before QApplication, instance() after it; never delete it.
+// GUI thread only. Without a controller every operation that would talk to the service does nothing and the
+// physical keyboard works as usual, through the input method that the environment asks for.
+//
+// A field describes itself by its object name, "<keyboard type>#<title>#<selection mode>#<last value>" (the
+// last one or two parts may be missing); a text item by the eleven fields of tagSoftKeyBoardInitData in their
+// order.
+class KSInputContext : public QPlatformInputContext, public ISoftKeyBoardControllerCallBack
+{
+    Q_OBJECT
+public:
+    // Chooses this class as the input context of the QApplication that is made next.
+    static void install();
+    // Null before QApplication, and when install() was not called.
+    static KSInputContext* instance();
+
+    // Made by the plug-in. inner is the input method that serves the physical keyboard; may be null.
+    explicit KSInputContext(std::unique_ptr<QPlatformInputContext> inner = nullptr);
+    ~KSInputContext() override;
+
+    QString identifierName() const;
+    QString language() const;
+
+    // The service; not owned, null takes it away and leaves the keyboard closed.
+    void setKeyBoardController(ISoftKeyBoardController* controller);
+    ISoftKeyBoardController* getKeyBoardController() const { return m_controller; }
+
+    // True while a key of the service is being delivered, so that it is not sent back.
+    bool isSendingKeyEvent() const { return m_sendingKeyEvent; }
+    static bool isSoftKeyboardClosed() { return m_bClosed; }
+
+    // Sends a key press to the service; false without a controller.
+    bool forwardKeyPress(const QEvent* event);
+    // Events of type 199 open the keyboard for the focus widget and those of type 200 close it; key presses
+    // go to the service while the keyboard is open. True when the event was used up.
+    bool filterEvent(const QEvent* event) override;
+    // True for keys that the open keyboard keeps to itself: Tab, Space, Home, End, page keys and F1 to F12.
+    bool filterSpecialKeyEvent(const QEvent* event) const;
+
+    void setFocusWidget(QWidget* widget);
+    QWidget* focusWidget() const { return m_baseFocusWidget; }
+    // Lets the next request look at the widget that has the focus now, instead of the one the keyboard was
+    // opened for.
+    static void resetFocusWidget();
+    // The widget that the keyboard works for: it outlives a change of focus while the keyboard is open.
+    QWidget* getFocusWidget();
+    // The text item of the view that is being edited, null when there is none.
+    static QGraphicsTextItem* getFocusTextItem(QGraphicsView* view);
+
+    SubCommonDefine::tagSoftKeyBoardInitData getSendData();
+    SubCommonDefine::tagSoftKeyBoardInitData getSendData(QLineEdit* edit);
+    SubCommonDefine::tagSoftKeyBoardInitData getSendData(QGraphicsTextItem* item);
+
+    // Opens the keyboard with a record of the caller's.
+    void showSoftKeyBoardWindow(SubCommonDefine::tagSoftKeyBoardInitData data);
+    // Ends a field: the state changes at once only in applications other than "Titler"; here the service
+    // reports it.
+    void closeSoftKeyBoardWindow();
+    // Put the keyboard away without its closing ceremony; closed at once.
+    void dummyCloseSoftKeyBoardWindow();
+    void simpleCloseSoftKeyBoardWindow();
+    // These four act only while the keyboard is open.
+    void showLimitInfo(SubCommonDefine::taLimitInfo info);
+    void cancelLimitInfo();
+    void showMaskOnSoftKeyboard();
+    void hideMaskOnSoftKeyboard();
+
+    // The native window that takes the X11 input focus when no field has it.
+    void setWindowID(unsigned long id);
+
+    // Commits what an input method is composing, then passes the event to the focus widget.
+    void sendEvent(const QInputMethodEvent& event);
+
+    // What the service sends.
+    void sendInputString(std::wstring text) override;
+    void sendInputStringOnEnterPressing(std::wstring text) override;
+    void sendInputStringOnTextChanged(std::wstring text) override;
+    void sendKey(SubCommonDefine::tagSoftKeyBoardKeyData data) override;
+    void sendInputStringSelectionPos(SubCommonDefine::tagSoftKeyBoardKeyTextSelectionPos pos) override;
+    // True tells that the keyboard is up.
+    void sendSoftKeyboardState(bool shown) override;
+
+    // The part of an input context that Qt calls.
+    bool isValid() const override;
+    bool hasCapability(Capability capability) const override;
+    void reset() override;
+    void commit() override;
+    void update(Qt::InputMethodQueries queries) override;
+    void invokeAction(QInputMethod::Action action, int cursorPosition) override;
+    void showInputPanel() override;
+    void hideInputPanel() override;
+    bool isInputPanelVisible() const override;
+    void setFocusObject(QObject* object) override;
+    bool event(QEvent* event) override;
+    bool eventFilter(QObject* object, QEvent* event) override;
+
+    static bool m_bClosed;
+    static QPointer<QWidget> m_pFocusWidget;
+    static QString m_strLimitCondition; // pattern of the field's validator
+    static constexpr int SoftKeyBoardCloseType = 1100;
+    static QEvent m_eKeyBoardClosed; // what a field gets when the keyboard was closed under it
+
+private:
+    bool filterKeyPressEvent(const QEvent* event);
+    bool filterRequestSoftwareInputPanel();
+    bool filterCloseSoftwareInputPanel();
+    bool isErrorForGettingFocusWidget();
+    bool showForFocusWidget(const SubCommonDefine::tagSoftKeyBoardInitData& data);
+    void handleInputString(const std::wstring& text, bool onEnter);
+    void handleInputStringOfQGraphicsView(QGraphicsView* view, const QString& text);
+    void handleInputStringOfQLineEdit(QLineEdit* edit, const QString& text, bool onEnter);
+    void handleInputStringOfQCombobox(QComboBox* box, const QString& text, bool onEnter);
+    void checkInputString(QLineEdit* edit, const QString& text);
+    void sendSoftKeyBoardClosedEventToFocusWidget();
+    void setCursorSelection(const SubCommonDefine::tagSoftKeyBoardKeyTextSelectionPos& pos, QLineEdit* edit);
+    void setClosed(bool closed);
+
+    static KSInputContext* s_instance;
+    std::unique_ptr<QPlatformInputContext> m_inner;
+    ISoftKeyBoardController* m_controller = nullptr;
+    bool m_sendingKeyEvent = false;
+    unsigned long m_windowId = 0;
+    QPointer<QWidget> m_baseFocusWidget;
+    bool m_keyReleased = false; // the field is handling the release of a key
+};

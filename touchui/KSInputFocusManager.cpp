@@ -1,0 +1,66 @@
+#include "touchui/KSInputFocusManager.h"
+
+#include <X11/Xlib.h>
+
+namespace
+{
+
+int ignoreError(Display*, XErrorEvent*)
+{
+    return 0;
+}
+
+// A display connection on which an error, such as a window that was just closed, does not end the process.
+class DisplayConnection
+{
+public:
+    DisplayConnection() : m_display(XOpenDisplay(nullptr))
+    {
+        if (m_display != nullptr) {
+            m_previousHandler = XSetErrorHandler(ignoreError);
+        }
+    }
+    ~DisplayConnection()
+    {
+        if (m_display != nullptr) {
+            XCloseDisplay(m_display); // waits for the answers, so the handler must still stand
+            XSetErrorHandler(m_previousHandler);
+        }
+    }
+    DisplayConnection(const DisplayConnection&) = delete;
+    DisplayConnection& operator=(const DisplayConnection&) = delete;
+
+    Display* get() const { return m_display; }
+
+private:
+    Display* m_display;
+    XErrorHandler m_previousHandler = nullptr;
+};
+
+Window focusWindow(Display* display)
+{
+    Window window = None;
+    int revertTo = RevertToNone;
+    XGetInputFocus(display, &window, &revertTo);
+    return window;
+}
+
+} // namespace
+
+unsigned long KSInputFocusManager::getInputFocusWindow()
+{
+    const DisplayConnection connection;
+    return connection.get() == nullptr ? 0 : focusWindow(connection.get());
+}
+
+void KSInputFocusManager::setInputFocusWindow(unsigned long window)
+{
+    const DisplayConnection connection;
+    if (connection.get() == nullptr || window == None) {
+        return;
+    }
+    if (focusWindow(connection.get()) != window) {
+        XSetInputFocus(connection.get(), window, RevertToPointerRoot, CurrentTime);
+        XFlush(connection.get());
+    }
+}

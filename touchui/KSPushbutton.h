@@ -1,0 +1,90 @@
+#pragma once
+
+#include "touchui/TouchEventButton.h"
+
+#include <QPixmap>
+#include <QStringList>
+
+class QPainter;
+
+// A touch button that paints itself from pictures: three slices, left, centre and right, for each state.
+//
+// The picture string is "<folder>:<left>:<centre>:<right>:..." with three names for each state in the order
+// of _enumButtonState; a name stands for ":/<folder>/<name>", an empty one leaves its slice undrawn. Over the
+// slices come the background picture, the icon, the movable picture and the text.
+//
+// pressed(int) and signalReleased(bool, int) of this class hide those of its bases; connect those through the
+// base.
+class KSPushbutton : public TouchEventButton
+{
+    Q_OBJECT
+public:
+    enum _enumButtonState {
+        ButtonRest = 0,
+        ButtonPressed = 1,
+        ButtonDisabled = 2,
+        ButtonSelectedRest = 3,
+        ButtonSelectedPressed = 4,
+        ButtonSelectedDisabled = 5,
+        ButtonStateCount
+    };
+    using enumButtonState = _enumButtonState;
+
+    explicit KSPushbutton(const QString& images, QWidget* parent = nullptr);
+    KSPushbutton(const QString& images, const QString& text, QWidget* parent = nullptr);
+    explicit KSPushbutton(QWidget* parent = nullptr);
+
+    // Out of range is ignored.
+    void changeButtonState(_enumButtonState state);
+    void changeButtonState(int state);
+    _enumButtonState buttonState() const { return m_state; }
+    // What is on the screen: follows the state unless auto state is off.
+    _enumButtonState paintedState() const { return m_paintedState; }
+    // While off, the button goes on showing the state it showed.
+    void setAutoState(bool autoState);
+
+    // Moves between the plain and the selected row and keeps the rest of the state.
+    void setSelected(bool selected);
+    bool isSelected() const { return m_state >= ButtonSelectedRest; }
+
+    void setImage(const QString& images);
+    void setMovableImage(const QPixmap& image, const QPoint& position = QPoint());
+    void setBackgroudImage(const QPixmap& image);
+    // Frees the slices, the movable and the background picture.
+    void cleanImages();
+
+    void setTextAlignment(Qt::Alignment alignment);
+    Qt::Alignment textAlignment() const { return m_textAlignment; }
+    // Distance of the text from the left and right edge, in pixels.
+    void setTextMargin(int margin);
+    int textMargin() const { return m_textMargin; }
+    void setButtonId(int id) { m_buttonId = id; }
+    int buttonId() const { return m_buttonId; }
+
+Q_SIGNALS:
+    void signalReleased(bool outside, int buttonId);
+    void pressed(int buttonId);
+
+protected:
+    void paintEvent(QPaintEvent* event) override;
+    void changeEvent(QEvent* event) override;
+
+private:
+    void init();
+    void drawImage(QPainter& painter, _enumButtonState state);
+    void drawIcon(QPainter& painter);
+    void drawText(QPainter& painter);
+    const QPixmap& slice(int index);
+
+    QStringList m_imageNames;
+    QList<QPixmap> m_slices; // loaded at first use, in the order of the names
+    _enumButtonState m_state = ButtonRest;
+    _enumButtonState m_paintedState = ButtonRest;
+    bool m_autoState = true;
+    QPixmap m_movableImage;
+    QPoint m_movablePosition;
+    QPixmap m_backgroundImage;
+    Qt::Alignment m_textAlignment = Qt::AlignCenter;
+    int m_buttonId = -1;
+    int m_textMargin = 8;
+};
