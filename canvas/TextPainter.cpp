@@ -7,6 +7,7 @@
 #include <QAbstractTextDocumentLayout>
 #include <QApplication>
 #include <QPainter>
+#include <QPainterPathStroker>
 #include <QPalette>
 #include <QTextBlock>
 #include <QTextBoundaryFinder>
@@ -171,19 +172,31 @@ void TextPainter::drawItemBoundingRect(QPainter* painter)
     const int status = child->getBoundingLineStatus();
     if (status == FocusNone || (status == FocusEdit && child->getFocusFlag() != FocusEdit))
         return;
-    const QRectF frame = child->boundingRect();
+    prepareFrame(child->boundingRect());
+    painter->setRenderHint(QPainter::Antialiasing, false);
+    painter->fillRect(m_frame.rect, status == FocusObject ? SelectedFill : EditFill);
+    painter->setRenderHint(QPainter::Antialiasing);
     if (status == FocusObject) {
-        painter->setPen(QPen(QColor(ITEMBOUNDINGSOLIDCOLOR), ITEMBOUNDINGWIDTH, Qt::SolidLine));
-        painter->setBrush(SelectedFill);
-        painter->drawRoundedRect(frame, FrameRadius, FrameRadius);
+        painter->fillPath(m_frame.solid, QColor(ITEMBOUNDINGSOLIDCOLOR));
         return;
     }
-    painter->setPen(QPen(QColor(ITEMBOUNDINGDOTUPCOLOR), ITEMBOUNDINGWIDTH, Qt::SolidLine));
-    painter->setBrush(EditFill);
-    painter->drawRoundedRect(frame, FrameRadius, FrameRadius);
-    painter->setPen(QPen(QColor(ITEMBOUNDINGDOTDOWNCOLOR), ITEMBOUNDINGWIDTH, Qt::DotLine));
-    painter->setBrush(Qt::NoBrush);
-    painter->drawRoundedRect(frame, FrameRadius, FrameRadius);
+    painter->fillPath(m_frame.solid, QColor(ITEMBOUNDINGDOTUPCOLOR));
+    painter->fillPath(m_frame.dotted, QColor(ITEMBOUNDINGDOTDOWNCOLOR));
+}
+
+void TextPainter::prepareFrame(const QRectF& rect)
+{
+    if (m_frame.rect == rect)
+        return;
+    QPainterPath outline;
+    outline.addRoundedRect(rect, FrameRadius, FrameRadius);
+    const auto stroked = [&outline](Qt::PenStyle style) {
+        QPainterPath area =
+            QPainterPathStroker(QPen(Qt::black, ITEMBOUNDINGWIDTH, style)).createStroke(outline);
+        area.setFillRule(Qt::WindingFill);
+        return area;
+    };
+    m_frame = {rect, stroked(Qt::SolidLine), stroked(Qt::DotLine)};
 }
 
 void TextPainter::drawSelection(QPainter* painter)

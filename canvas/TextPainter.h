@@ -64,7 +64,15 @@ private:
         size_t index;
     };
 
+    // A frame as it is stroked; dots cost more to make than to fill.
+    struct Frame {
+        QRectF rect;
+        QPainterPath solid;
+        QPainterPath dotted;
+    };
+
     void collectGlyphs();
+    void prepareFrame(const QRectF& rect);
     void collectBlock(const QTextBlock& block);
     void addGlyph(int position, const QString& text, const CaretGeometry::Caret& caret);
     void addRuns(const Glyph& glyph);
@@ -77,5 +85,6 @@ private:
     std::vector<PendingRun> m_pending;
     std::vector<Step> m_steps;
     std::vector<CaretGeometry::Caret> m_blockCarets;
+    Frame m_frame;
     bool m_valid = false;
 };
