@@ -12,7 +12,12 @@ namespace
 class StructureScan
 {
 public:
-    explicit StructureScan(std::string_view bytes) : mPos(bytes.data()), mEnd(mPos + bytes.size()) {}
+    explicit StructureScan(std::string_view bytes)
+        : mPos(bytes.data())
+        , mEnd(mPos + bytes.size())
+        , mHasReferences(bytes.find("&#") != std::string_view::npos)
+    {
+    }
 
     bool run()
     {
@@ -88,8 +93,10 @@ private:
 
     // For a character reference without digits or end TinyXML looks ahead past quotes and tags, and would see
     // another structure than this scan.
-    static bool hasGoodReferences(const char* p, const char* end)
+    bool hasGoodReferences(const char* p, const char* end) const
     {
+        if (!mHasReferences)
+            return true;
         while ((p = static_cast<const char*>(std::memchr(p, '&', static_cast<std::size_t>(end - p))))) {
             if (end - ++p < 1 || *p != '#')
                 continue;
@@ -232,6 +239,7 @@ private:
 
     const char* mPos;
     const char* mEnd;
+    bool mHasReferences;
     int mDepth = 0;
     bool mIsDone = false;
 };
