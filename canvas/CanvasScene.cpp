@@ -68,7 +68,6 @@ CanvasScene::~CanvasScene()
     blockSignals(true);
     for (GraphicsText* item : std::as_const(*m_texts).listed())
         item->disconnect(this);
-    m_texts->listed().clear();
     clear();
 }
 
@@ -93,10 +92,15 @@ void CanvasScene::savePreviousArchiveInfo()
         disableTextPropertyArea();
     }
     m_defaultFontUsed = false;
+    clear();
+}
+
+void CanvasScene::clear()
+{
     m_texts->listed().clear();
     m_safeArea->forget();
     m_currentPixmapItem = nullptr;
-    clear();
+    QGraphicsScene::clear();
 }
 
 bool CanvasScene::archiveIsNull(const Archive* archive)

@@ -100,11 +100,14 @@ class TitlerTest(unittest.TestCase):
         self.start_titler()
 
     def start_titler(self):
+        start = self.appliance.mark()
         self.titler = session.start_titler(BUILD, os.path.join(self.keep, "titler.log"), self.environment,
                                            self.titler_arguments)
         self.addCleanup(self.titler.stop)
         session.wait_listening(self.titler, session.TITLER_PORT + OFFSET, 60 * SLOW)
         self.command("wait-titler")
+        # The last service that a titler registers at: from here on every notice reaches it.
+        self.wait_call("APPEventFilter", "registerNotify", start, 60)
 
     def tearDown(self):
         outcome = self._outcome.result
@@ -241,8 +244,10 @@ class TitlerTest(unittest.TestCase):
         self.assertLessEqual(answer["mean"], mean, answer)
         self.assertLessEqual(answer["visible"], visible, answer)
 
-    def assert_pictures_have_their_sizes(self, title):
+    def assert_pictures_have_their_sizes(self, title, may_be_missing=()):
         for suffix, (width, height) in PICTURES.items():
+            if suffix in may_be_missing and not os.path.exists(title.picture(suffix)):
+                continue
             with self.subTest(picture=suffix):
                 self.assertEqual(pngdiff("size", title.picture(suffix)), {"width": width, "height": height})
 
