@@ -68,6 +68,7 @@ CanvasScene::~CanvasScene()
     blockSignals(true);
     for (GraphicsText* item : std::as_const(*m_texts).listed())
         item->disconnect(this);
+    m_texts->listed().clear();
     clear();
 }
 
@@ -92,15 +93,23 @@ void CanvasScene::savePreviousArchiveInfo()
         disableTextPropertyArea();
     }
     m_defaultFontUsed = false;
-    clear();
+    removeAllItems();
 }
 
-void CanvasScene::clear()
+// The pointers go before what they point to.
+void CanvasScene::removeAllItems()
 {
     m_texts->listed().clear();
     m_safeArea->forget();
     m_currentPixmapItem = nullptr;
+    m_itemForKeyboard = nullptr;
     QGraphicsScene::clear();
+}
+
+void CanvasScene::clearCanvas()
+{
+    removeAllItems();
+    m_archive.reset();
 }
 
 bool CanvasScene::archiveIsNull(const Archive* archive)

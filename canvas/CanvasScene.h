@@ -53,15 +53,13 @@ public:
     explicit CanvasScene(std::unique_ptr<IThumbnailRender> render, QObject* parent = nullptr);
     ~CanvasScene() override;
 
-    // Deletes all items, and forgets them: the title is not shown any more. Hides the base's operation, which
-    // would leave this class with items that are gone.
-    void clear();
-
     void saveArchive();
     // Marks that the pictures of the title are out of date.
     void saveArchiveFlag() { m_thumbnailNeeded = true; }
     void createThumnailPicture();
     bool isEditFinish() const;
+    // Shows no title. Nothing is saved.
+    void clearCanvas();
 
     bool itemIsEditorInteraction() const;
     bool itemIsSelectionMode() const;
@@ -156,6 +154,7 @@ protected:
 
 private:
     void savePreviousArchiveInfo();
+    void removeAllItems();
     bool archiveIsNull(const Archive* archive);
     void reportMissingFamily();
     GraphicsText* buildPair(TText* record);
