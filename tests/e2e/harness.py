@@ -3,6 +3,7 @@
 Every test gets a fresh data path, log folder, display and pair of processes. When a test fails, its screenshot, the
 logs and the picture differences stay under tests/e2e/ in the build tree.
 """
+import atexit
 import json
 import os
 import shutil
@@ -64,6 +65,7 @@ class Title:
 class TitlerTest(unittest.TestCase):
     """A test case with a running appliance and titler."""
 
+    samples = None
     titler_arguments = ()
     environment_changes = {}
 
@@ -88,9 +90,17 @@ class TitlerTest(unittest.TestCase):
         self.start_programs()
 
     def provision(self):
-        done = subprocess.run([os.path.join(BUILD, "bin", "titler_provision")], env=self.environment, check=True,
-                              stdout=subprocess.PIPE, text=True)
-        return done.stdout.splitlines()[-1]
+        """Copies the sample data, which the first test of a run makes."""
+        cls = TitlerTest
+        if cls.samples is None:
+            cls.samples = tempfile.mkdtemp(prefix="titler-")
+            atexit.register(shutil.rmtree, cls.samples, ignore_errors=True)
+            environment = dict(self.environment, K2SYS_AC_DATA=os.path.join(cls.samples, "d"))
+            subprocess.run([os.path.join(BUILD, "bin", "titler_provision")], env=environment, check=True,
+                           stdout=subprocess.DEVNULL)
+        data = self.environment["K2SYS_AC_DATA"]
+        shutil.copytree(os.path.join(cls.samples, "d"), data)
+        return os.path.join(data, "defaultuser") + "/"
 
     def start_programs(self):
         self.appliance = session.Appliance(BUILD, os.path.join(self.keep, "appliance.log"), self.environment)
@@ -100,11 +110,14 @@ class TitlerTest(unittest.TestCase):
         self.start_titler()
 
     def start_titler(self):
+        start = self.appliance.mark()
         self.titler = session.start_titler(BUILD, os.path.join(self.keep, "titler.log"), self.environment,
                                            self.titler_arguments)
         self.addCleanup(self.titler.stop)
         session.wait_listening(self.titler, session.TITLER_PORT + OFFSET, 60 * SLOW)
         self.command("wait-titler")
+        # The last service that a titler registers at: from here on every notice reaches it.
+        self.wait_call("APPEventFilter", "registerNotify", start, 60)
 
     def tearDown(self):
         outcome = self._outcome.result
@@ -241,8 +254,10 @@ class TitlerTest(unittest.TestCase):
         self.assertLessEqual(answer["mean"], mean, answer)
         self.assertLessEqual(answer["visible"], visible, answer)
 
-    def assert_pictures_have_their_sizes(self, title):
+    def assert_pictures_have_their_sizes(self, title, may_be_missing=()):
         for suffix, (width, height) in PICTURES.items():
+            if suffix in may_be_missing and not os.path.exists(title.picture(suffix)):
+                continue
             with self.subTest(picture=suffix):
                 self.assertEqual(pngdiff("size", title.picture(suffix)), {"width": width, "height": height})
 

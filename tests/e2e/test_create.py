@@ -35,9 +35,11 @@ class CreateTitles(harness.TitlerTest):
         self.assertGreater(new[0], new[1], "the names tell the time of making")
         self.assertEqual(result["type"], CALL_TYPE)
         self.assertEqual(result["path"], folder)
-        self.assertEqual(result["paths"], new)
+        # Titles are named relative to the folder, as in its order file.
+        names = [os.path.basename(path) for path in new]
+        self.assertEqual(result["paths"], names)
         self.assertEqual(result["count"], 2)
-        self.assertEqual(result["size"], sum(self.packed_size(path) for path in new))
+        self.assertEqual(result["size"], sum(self.packed_size(name) for name in names))
         for path in new:
             title = harness.Title(path)
             self.assertTrue(os.path.exists(path))
@@ -72,9 +74,9 @@ class CreateTitles(harness.TitlerTest):
         return result
 
     @staticmethod
-    def packed_size(path):
+    def packed_size(text):
         """A wide string on the wire: its header, its bytes and a NUL."""
-        length = len(path.encode()) + 1
+        length = len(text.encode()) + 1
         return (1 if length < 32 else 3 if length < 65536 else 5) + length
 
 

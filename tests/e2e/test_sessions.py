@@ -10,6 +10,7 @@ ANSWER_OK = 2
 class ClosingQuestion(harness.TitlerTest):
     def test_new_titles_of_an_edit_request_are_asked_about(self):
         folder = self.folder()
+        self.command("register")
         self.open_title(self.titles(folder)[0])
         self.choose_in_list_menu(0, "Copy")
         self.choose_in_list_menu(0, "Paste")
@@ -46,13 +47,13 @@ class Requests(harness.TitlerTest):
         harness.session.wait_until(lambda: self.display.grab() != before, 20 * harness.SLOW, "the mask")
         self.command("dialog-mask 0")
         harness.session.wait_until(lambda: self.display.grab() == before, 20 * harness.SLOW, "the first title again")
-        self.assert_canvas_shows(first, mean=1.5, visible=0.01)
+        self.assert_canvas_shows(first, mean=1.0, visible=0.01)
 
     def test_a_path_that_does_not_exist_shows_nothing(self):
         self.command(f'edit "{self.folder("gone")}/gone.xml"')
         first = self.titles(self.folder())[0]
         self.open_title(first)
-        self.assert_canvas_shows(first, mean=1.5, visible=0.01)
+        self.assert_canvas_shows(first, mean=1.0, visible=0.01)
 
     def test_the_sub_panel_opens_the_window_and_gets_no_result(self):
         self.open_title(self.titles(self.folder())[0])
