@@ -31,6 +31,7 @@ int main(int argc, char* argv[])
 
     APPEventFilter::instance();
     Q_INIT_RESOURCE(UILibrary);
+    Q_INIT_RESOURCE(TitlerToolResource);
 
     const QStringList arguments = application.arguments().mid(1);
     registerSystemSignalHandler(onSystemSingleCaught, "KS2Titler");

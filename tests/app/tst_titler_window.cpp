@@ -72,6 +72,7 @@ void tst_titler_window::initTestCase()
     QVERIFY(mSiblings.listenOnFreePorts());
     APPEventFilter::instance();
     Q_INIT_RESOURCE(UILibrary);
+    Q_INIT_RESOURCE(TitlerToolResource);
     mWindow = new TitlerWindow(true, nullptr);
     pMainWindow = mWindow;
     mWindow->setRealClose(false);
