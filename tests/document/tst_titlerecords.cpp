@@ -280,4 +280,4 @@ private slots:
 };
 
 QTEST_GUILESS_MAIN(TestRecords)
-#include "tst_records.moc"
+#include "tst_titlerecords.moc"
