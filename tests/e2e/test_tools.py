@@ -69,6 +69,19 @@ class PictureTools(unittest.TestCase):
 
 
 class Screen(unittest.TestCase):
+    def test_spare_keys_take_characters(self):
+        with tempfile.TemporaryDirectory() as folder:
+            display = harness.session.Display(folder, harness.session.program_environment(harness.BUILD))
+            try:
+                display.add_keys("速é")
+                keymap = subprocess.run(["xkbcomp", "-xkb", display.name, "-"], env=display.environment, check=True,
+                                        capture_output=True, text=True).stdout
+                self.assertRegex(keymap, r"<FK13> +{ +\[ +U901F")
+                self.assertRegex(keymap, r"<FK14> +{ +\[ +eacute")
+                self.assertRaises(harness.session.SessionError, display.add_keys, "x" * 13)
+            finally:
+                display.stop()
+
     def test_a_display_shows_and_takes_clicks(self):
         with tempfile.TemporaryDirectory() as folder:
             display = harness.session.Display(folder, harness.session.program_environment(harness.BUILD))
