@@ -11,7 +11,11 @@
 #include <QTest>
 #include <QVBoxLayout>
 
+#define XK_MISCELLANY
+#define XK_XKB_KEYS
 #include <X11/Xlib.h>
+#include <X11/keysymdef.h>
+#include <algorithm>
 // Xlib's names that clash with Qt's.
 #undef KeyPress
 #undef KeyRelease
@@ -47,6 +51,33 @@ bool windowManagerIsUp()
     }
     XCloseDisplay(display);
     return count == 1;
+}
+
+// Gives letters that the keyboard lacks a key of their own. A tool that maps each of them for the moment of
+// its key press may have taken it away again before the program has read the map.
+bool addKeys(const QList<KeySym>& wanted)
+{
+    Display* display = XOpenDisplay(nullptr);
+    if (display == nullptr) {
+        return false;
+    }
+    int lowest = 0;
+    int highest = 0;
+    XDisplayKeycodes(display, &lowest, &highest);
+    int perKey = 0;
+    KeySym* map = XGetKeyboardMapping(display, static_cast<KeyCode>(lowest), highest - lowest + 1, &perKey);
+    qsizetype next = 0;
+    for (int code = highest; code >= lowest && next < wanted.size(); --code) {
+        const KeySym* symbols = map + static_cast<qsizetype>(code - lowest) * perKey;
+        if (std::all_of(symbols, symbols + perKey, [](KeySym symbol) { return symbol == 0; })) {
+            KeySym symbol = wanted.at(next);
+            XChangeKeyboardMapping(display, code, 1, &symbol, 1);
+            ++next;
+        }
+    }
+    XFree(map);
+    XCloseDisplay(display);
+    return next == wanted.size();
 }
 
 class FakeService : public ISoftKeyBoardController
@@ -105,6 +136,12 @@ void TestInputContextX11::initTestCase()
     m_windowManager.start(QStringLiteral("openbox"), {QStringLiteral("--sm-disable")});
     QVERIFY(m_windowManager.waitForStarted());
     QTRY_VERIFY(windowManagerIsUp());
+    constexpr KeySym UNICODE = 0x1000000;
+    QList<KeySym> symbols{XK_dead_acute};
+    for (const QChar letter : QStringLiteral("速報속보")) {
+        symbols.append(UNICODE + letter.unicode());
+    }
+    QVERIFY(addKeys(symbols));
     qApp->setObjectName(QStringLiteral("Titler"));
     qApp->installEventFilter(&m_filter);
     QVERIFY(KSInputContext::instance() != nullptr);
@@ -133,7 +170,8 @@ void TestInputContextX11::cleanupTestCase()
 
 void TestInputContextX11::press(const QStringList& arguments)
 {
-    // Letters that the keyboard lacks are mapped while they are typed, which only a running event loop follows.
+    // Letters that the keyboard lacks are mapped while they are typed, which only a running event loop
+    // follows.
     QProcess tool;
     tool.start(QStringLiteral("xdotool"), arguments);
     QTRY_COMPARE(tool.state(), QProcess::NotRunning);
