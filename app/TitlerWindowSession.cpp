@@ -40,6 +40,7 @@ void TitlerWindow::showTitlerWindow(titler_paramter paramter)
     }
     mCanvasScene->setModuleInfo(m_emModuleInfo);
 
+    mToolsBar->setFolderButtonEnabled(false); // there is no picker to open
     m_bEditByMain = paramter.mode == _titler_paramter::CREATE_OR_EDIT;
     if (paramter.mode == _titler_paramter::CREATE_OR_EDIT) {
         refreshArchiveList(QString::fromStdWString(paramter.path));
@@ -125,7 +126,7 @@ void TitlerWindow::closeTitlerMainWindow()
         close();
     } else {
         hide();
-        mCanvasScene->clear();
+        mCanvasScene->clearCanvas();
         mArchiveList->cleanArchiveList();
         mArchiveList->clearCopyArchive();
     }

@@ -1,22 +1,38 @@
 #include "app/APPEventFilter.h"
 #include "app/TitlerWindow.h"
+#include "support/FileSyncQueue.h"
+#include "support/IPathManagerEx.h"
+#include "support/LeftoverSweep.h"
+#include "support/LocaleText.h"
 #include "support/SystemSignalHandler.h"
 #include "touchui/KSInputContext.h"
 
 #include <QApplication>
 #include <QStringList>
+#include <chrono>
 
 namespace
 {
 
 const QString RIGHT_OPTION = QStringLiteral("-right");
 constexpr int RIGHT_WINDOW_LEFT = 1280;
+constexpr std::chrono::seconds SYNC_DEADLINE(10);
 
 // Called in the GUI thread when the process is told to stop.
 void onSystemSingleCaught()
 {
     if (pMainWindow)
         pMainWindow->endProcess();
+}
+
+// What a process that was killed in the middle of a save left behind; the list looks after the title folders.
+void sweepSettings()
+{
+    IPathManagerEx* paths = IPathManagerEx::getInstance();
+    for (const std::wstring& folder : {paths->getSystemSettingPath(), paths->getTitlerTemplatesPath()}) {
+        if (!folder.empty())
+            LeftoverSweep::sweepWithChildren(wideToMultiByte(folder));
+    }
 }
 
 } // namespace
@@ -31,10 +47,12 @@ int main(int argc, char* argv[])
 
     APPEventFilter::instance();
     Q_INIT_RESOURCE(UILibrary);
+    Q_INIT_RESOURCE(TitlerToolResource);
 
     const QStringList arguments = application.arguments().mid(1);
     registerSystemSignalHandler(onSystemSingleCaught, "KS2Titler");
 
+    sweepSettings();
     pMainWindow = new TitlerWindow(true, nullptr);
     pMainWindow->move(arguments.contains(RIGHT_OPTION) ? RIGHT_WINDOW_LEFT : 0, 0);
     pMainWindow->setRealClose(false);
@@ -45,5 +63,6 @@ int main(int argc, char* argv[])
     delete pMainWindow;
     pMainWindow = nullptr;
     APPEventFilter::release();
+    FileSyncQueue::flush(SYNC_DEADLINE);
     return result;
 }

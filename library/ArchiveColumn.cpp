@@ -38,7 +38,13 @@ ArchiveColumn::ArchiveColumn(QWidget* parent)
         "QScrollBar::handle:vertical { min-height: 42px; background-color: rgb(102, 102, 102) }"));
 
     QScrollBar* own = verticalScrollBar();
-    connect(own, &QScrollBar::rangeChanged, mBar, &QScrollBar::setRange);
+    // The bar shows only while there is something to scroll to.
+    const auto followRange = [this](int minimum, int maximum) {
+        mBar->setRange(minimum, maximum);
+        mBar->setVisible(maximum > minimum);
+    };
+    connect(own, &QScrollBar::rangeChanged, this, followRange);
+    followRange(own->minimum(), own->maximum());
     connect(own, &QScrollBar::valueChanged, mBar, &QScrollBar::setValue);
     connect(mBar, &QScrollBar::valueChanged, own, &QScrollBar::setValue);
 

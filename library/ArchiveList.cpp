@@ -2,12 +2,14 @@
 
 #include "document/Archive.h"
 #include "document/ArchiveController.h"
+#include "document/ArchiveManager.h"
 #include "document/ArchiveOrder.h"
 #include "library/ArchiveInitThread.h"
 #include "library/ArchiveItem.h"
 #include "library/ArchiveMenu.h"
 #include "library/FocusArchiveCommand.h"
 #include "library/ITitlerFolderReporter.h"
+#include "support/LeftoverSweep.h"
 #include "support/LogManager.h"
 
 #include <QCoreApplication>
@@ -23,6 +25,14 @@ namespace
 const int ITEMS_IN_VIEW = 6;    // before the list scrolls to the selection
 const int LOADER_POLL = 1;      // ms
 const int LABEL_FONT_SIZE = 13; // points
+
+// What a killed process left half-written in the title folders goes before anything is read from them.
+void sweepTitleFolders()
+{
+    const std::string root = ArchiveManager::getInstance()->getTitleRootFolderPath();
+    if (!root.empty())
+        LeftoverSweep::sweepWithChildren(root);
+}
 
 } // namespace
 
@@ -42,6 +52,7 @@ ArchiveList::ArchiveList(QLabel* folderLabel, bool autoInit, QWidget* parent)
         mFolderLabel->setText(tr("Folder"));
     }
     initArchiveListConnect();
+    sweepTitleFolders();
     mController->reCreateOrderXml();
     if (autoInit)
         initArchiveList();

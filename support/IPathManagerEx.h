@@ -1,6 +1,6 @@
 // Says where the appliance's files of each kind live. Paths are absolute and without a final "/"; a getter
 // gives an empty string while the path file or its entry is missing, and makes the folder when it does not
-// exist. GUI thread; file-system errors of making a folder are thrown.
+// exist. Any thread; file-system errors of making a folder are thrown.
 #pragma once
 
 #include <string>

@@ -42,9 +42,9 @@ void PathManagerEx::clearUp()
     mpPathManagerEx = nullptr;
 }
 
-PathManagerEx::PathManagerEx() : mpXmlLoader(nullptr), mBasePath(getDefaultPath())
+PathManagerEx::PathManagerEx()
+    : mBasePath(getDefaultPath()), mPathFile(wideToMultiByte(mBasePath) + "PathInfo.xml")
 {
-    mPathFile = wideToMultiByte(mBasePath) + "PathInfo.xml";
 }
 
 PathManagerEx::~PathManagerEx() = default;
@@ -63,16 +63,15 @@ std::wstring PathManagerEx::getDefaultPath()
 
 std::wstring PathManagerEx::getFolderPath(const std::string& node)
 {
-    if (!mpXmlLoader)
-        mpXmlLoader = IXMLLoader::getInstance();
+    IXMLLoader* const loader = IXMLLoader::getInstance();
     mScratchPath.clear();
-    if (!mpXmlLoader->load(mPathFile))
+    if (!loader->load(mPathFile))
         return {};
-    mpXmlLoader->selectRootNode();
-    if (!mpXmlLoader->selectNode(node))
+    loader->selectRootNode();
+    if (!loader->selectNode(node))
         return {};
-    mpXmlLoader->selectRootNode();
-    mScratchPath = wideToMultiByte(mBasePath) + mpXmlLoader->getAttribute(node, "path");
+    loader->selectRootNode();
+    mScratchPath = wideToMultiByte(mBasePath) + loader->getAttribute(node, "path");
     if (!boost::filesystem::exists(mScratchPath))
         boost::filesystem::create_directories(mScratchPath);
     return multiByteToWide(mScratchPath);
@@ -80,6 +79,7 @@ std::wstring PathManagerEx::getFolderPath(const std::string& node)
 
 std::wstring PathManagerEx::cached(std::wstring& cache, const char* node)
 {
+    const std::lock_guard lock(mMutex);
     if (cache.empty())
         cache = getFolderPath(node);
     return cache;

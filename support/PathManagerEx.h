@@ -5,7 +5,7 @@
 
 #include "support/IPathManagerEx.h"
 
-class IXMLLoader;
+#include <mutex>
 
 class PathManagerEx : public IPathManagerEx
 {
@@ -48,7 +48,7 @@ private:
     static std::string get_uuid();
     static std::string char_to_string(unsigned char byte);
 
-    IXMLLoader* mpXmlLoader; // owned by itself
+    std::mutex mMutex; // of what follows
     std::wstring mBasePath;
     std::string mPathFile;
     std::string mScratchPath;

@@ -13,7 +13,8 @@ class CreateTitles(harness.TitlerTest):
         """Asks for new titles; the folder that was open last stands for the operator's choice."""
         self.open_title(self.titles(folder)[0])
         self.close_window()
-        self.appliance.command(f"create {CALL_TYPE}")
+        self.command("register")
+        self.command(f"create {CALL_TYPE}")
         self.wait_shown()
 
     def test_new_titles_come_back_in_the_order_of_the_folder(self):
@@ -28,15 +29,17 @@ class CreateTitles(harness.TitlerTest):
             self.wait_titles(folder, count + 1)
         self.close_window()
 
-        result = self.appliance.wait_event("result", start=start)
+        result = self.wait_result(start)
         new = [title.path for title in self.titles(folder) if title.path not in old]
         self.assertEqual(len(new), 2)
         self.assertGreater(new[0], new[1], "the names tell the time of making")
         self.assertEqual(result["type"], CALL_TYPE)
         self.assertEqual(result["path"], folder)
-        self.assertEqual(result["files"], new)
+        # Titles are named relative to the folder, as in its order file.
+        names = [os.path.basename(path) for path in new]
+        self.assertEqual(result["paths"], names)
         self.assertEqual(result["count"], 2)
-        self.assertEqual(result["size"], sum(self.packed_size(path) for path in new))
+        self.assertEqual(result["size"], sum(self.packed_size(name) for name in names))
         for path in new:
             title = harness.Title(path)
             self.assertTrue(os.path.exists(path))
@@ -47,9 +50,9 @@ class CreateTitles(harness.TitlerTest):
         self.open_for_creation(folder)
         start = self.appliance.mark()
         self.close_window()
-        result = self.appliance.wait_event("result", start=start)
+        result = self.wait_result(start)
         self.assertEqual((result["type"], result["path"]), (CALL_TYPE, folder))
-        self.assertEqual((result["count"], result["size"], result["files"]), (0, 0, []))
+        self.assertEqual((result["count"], result["size"], result["paths"]), (0, 0, []))
 
     def test_a_title_that_was_deleted_again_is_not_named(self):
         folder = self.folder(FOLDER)
@@ -61,14 +64,19 @@ class CreateTitles(harness.TitlerTest):
         self.choose_in_list_menu(2, "Delete")
         self.wait_titles(folder, 2)
         self.close_window()
-        result = self.appliance.wait_event("result", start=start)
-        self.assertEqual(result["files"], [])
+        result = self.wait_result(start)
+        self.assertEqual(result["paths"], [])
         self.assertEqual([title.path for title in self.titles(folder)], old)
 
+    def wait_result(self, start):
+        result = self.appliance.wait_event("callback", 20 * harness.SLOW, start)
+        self.assertEqual(result["method"], "finishTitlerCreateCallback")
+        return result
+
     @staticmethod
-    def packed_size(path):
+    def packed_size(text):
         """A wide string on the wire: its header, its bytes and a NUL."""
-        length = len(path.encode()) + 1
+        length = len(text.encode()) + 1
         return (1 if length < 32 else 3 if length < 65536 else 5) + length
 
 

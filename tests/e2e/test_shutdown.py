@@ -25,12 +25,12 @@ class Shutdown(harness.TitlerTest):
         self.assert_no_leftovers(self.folder())
 
     def test_power_off_ends_an_idle_titler(self):
-        self.appliance.command("power-off")
+        self.command("power-off")
         self.assertEqual(self.titler.wait(20 * harness.SLOW), 0)
 
     def test_power_off_saves_first(self):
         title = self.type_a_text()
-        self.appliance.command("power-off")
+        self.command("power-off")
         self.assertEqual(self.titler.wait(30 * harness.SLOW), 0)
         self.assert_whole(title)
 
@@ -59,9 +59,9 @@ class Shutdown(harness.TitlerTest):
         self.click_tool("Close")
         self.titler.signal(signal.SIGKILL)
         self.titler.wait(10)
-        # Old or new, but readable.
+        # Old or new, but readable. The largest picture is taken away before it is drawn anew.
         self.assertIn(len(title.texts()), (2, 3))
-        self.assert_pictures_have_their_sizes(title)
+        self.assert_pictures_have_their_sizes(title, may_be_missing=("_1920.png",))
         # The next titler takes the title as it is.
         self.start_titler()
         self.open_title(title)

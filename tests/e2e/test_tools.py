@@ -46,9 +46,17 @@ class PictureTools(unittest.TestCase):
         same = self.screen(shot, title, (3, 2, 40, 20))
         self.assertEqual((same["compared"], same["visible"]), (800, 0))
         self.assertLess(same["mean"], 1)
+        # A pixel to the side is the same, more is not.
+        self.assertEqual(self.screen(shot, title, (4, 2, 40, 20))["visible"], 0)
         shifted = self.screen(shot, title, (0, 2, 40, 20))
         self.assertGreater(shifted["visible"], 0.05)
         self.assertEqual(shifted["largest"], 240)
+
+    def test_a_line_that_is_missing_on_either_side_is_seen(self):
+        plain = self.write("plain.png", 60, 30, lambda x, y: (10, 10, 10))
+        lined = self.write("lined.png", 60, 30, lambda x, y: (250, 250, 250) if 10 <= y < 15 else (10, 10, 10))
+        for shot, title in ((plain, lined), (lined, plain)):
+            self.assertGreater(self.screen(shot, title, (0, 0, 60, 30))["visible"], 0.09)
 
     def test_wrong_use_and_unreadable_pictures_are_refused(self):
         path = self.write("a.png", 4, 4, lambda x, y: (0, 0, 0))

@@ -46,6 +46,30 @@ int distance(QRgb a, QRgb b)
         {std::abs(qRed(a) - qRed(b)), std::abs(qGreen(a) - qGreen(b)), std::abs(qBlue(a) - qBlue(b))});
 }
 
+// By how much a pixel of one picture leaves the range of the colours within one pixel of it in the other.
+int distanceToNeighbourhood(QRgb pixel, const QImage& other, int x, int y)
+{
+    std::array<int, 3> low{255, 255, 255};
+    std::array<int, 3> high{0, 0, 0};
+    for (int row = std::max(y - 1, 0); row <= std::min(y + 1, other.height() - 1); ++row) {
+        const auto* line = reinterpret_cast<const QRgb*>(other.constScanLine(row));
+        for (int column = std::max(x - 1, 0); column <= std::min(x + 1, other.width() - 1); ++column) {
+            const std::array<int, 3> near{qRed(line[column]), qGreen(line[column]), qBlue(line[column])};
+            for (std::size_t channel = 0; channel < near.size(); ++channel) {
+                low.at(channel) = std::min(low.at(channel), near.at(channel));
+                high.at(channel) = std::max(high.at(channel), near.at(channel));
+            }
+        }
+    }
+    const std::array<int, 3> value{qRed(pixel), qGreen(pixel), qBlue(pixel)};
+    int distance = 0;
+    for (std::size_t channel = 0; channel < value.size(); ++channel) {
+        distance =
+            std::max({distance, low.at(channel) - value.at(channel), value.at(channel) - high.at(channel)});
+    }
+    return distance;
+}
+
 QJsonObject boxWhere(const QImage& image, const std::function<bool(int, int)>& counts)
 {
     QRect box;
@@ -105,7 +129,8 @@ std::optional<QJsonObject> compareWithScreen(const QStringList& arguments)
     }
     const QImage shown = screen->copy(rect);
     // Where the title is transparent, the screen shows what lies under the canvas; it is not compared.
-    const QImage wanted = title->scaled(rect.size(), Qt::IgnoreAspectRatio, Qt::SmoothTransformation);
+    const QImage wanted = title->scaled(rect.size(), Qt::IgnoreAspectRatio, Qt::SmoothTransformation)
+                              .convertToFormat(QImage::Format_ARGB32);
 
     QImage difference(rect.size(), QImage::Format_RGB32);
     difference.fill(Qt::black);
@@ -118,7 +143,8 @@ std::optional<QJsonObject> compareWithScreen(const QStringList& arguments)
             if (qAlpha(pixel) < 255) {
                 continue;
             }
-            const int level = distance(pixel, shown.pixel(x, y));
+            const int level = std::max(distanceToNeighbourhood(pixel, shown, x, y),
+                                       distanceToNeighbourhood(shown.pixel(x, y), wanted, x, y));
             ++histogram.at(static_cast<std::size_t>(level));
             ++compared;
             sum += level;

@@ -33,6 +33,7 @@ private slots:
     void createInAnEmptyFolder();
     void createByRequestGoesToTheEnd();
     void createWithoutAFolderDoesNothing();
+    void createFromABlankTemplate();
     void moveAndBack();
     void runOfTapsIsOneStep();
     void focusOfTheSameItemChangesNothing();
@@ -286,6 +287,18 @@ void tst_ArchiveCommands::createWithoutAFolderDoesNothing()
     mList->createArchiveFromTemplate(nullptr);
     QVERIFY(mList->isEmpty());
     QCOMPARE(mStack->count(), 0);
+}
+
+void tst_ArchiveCommands::createFromABlankTemplate()
+{
+    const QString folder = open(QStringLiteral("blank template"), {});
+    Archive blank;
+    mList->createArchiveFromTemplate(&blank);
+    mList->createArchiveFromTemplate(&blank);
+    QCOMPARE(mList->count(), 2);
+    // The titles and the order, and no picture from nowhere.
+    QCOMPARE(QDir(folder).entryList(QDir::AllEntries | QDir::Hidden | QDir::NoDotAndDotDot).size(), 3);
+    QVERIFY(stem(0) != stem(1));
 }
 
 void tst_ArchiveCommands::moveAndBack()

@@ -48,6 +48,7 @@ private slots:
     void cleaningForgetsTheFolder();
     void selectionIsScrolledIntoView();
     void moveModeIgnoresTaps();
+    void leftoversOfAKilledSaveAreSwept();
     void language();
 
 private:
@@ -581,6 +582,20 @@ void tst_ArchiveList::moveModeIgnoresTaps()
     mList->moveButtonClicked(false);
     QCOMPARE(mList->getMoveState(), 0);
     QCOMPARE(drag.count(), 2);
+}
+
+void tst_ArchiveList::leftoversOfAKilledSaveAreSwept()
+{
+    const QString folder = threeTitles(QStringLiteral("leftovers"));
+    const QString aside = folder + QStringLiteral("/.titler-new-0-0-1");
+    QFile file(aside);
+    QVERIFY(file.open(QIODevice::WriteOnly));
+    file.write("half a pict");
+    file.close();
+    QLabel label;
+    const ArchiveList list(&label, false);
+    QVERIFY(!QFile::exists(aside));
+    QVERIFY(QFile::exists(folder + QStringLiteral("/a.xml")));
 }
 
 void tst_ArchiveList::language()

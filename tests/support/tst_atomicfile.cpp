@@ -102,6 +102,7 @@ private slots:
     {
         const std::string file = path("title.xml");
         QVERIFY(AtomicFile::write(file, "old"));
+        QVERIFY(FileSyncQueue::flush(30s)); // its thread holds no lock while the process is doubled
         const pid_t child = ::fork();
         if (child == 0) {
             ::signal(SIGXFSZ, SIG_IGN);

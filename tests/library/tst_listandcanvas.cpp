@@ -1,0 +1,178 @@
+// The list, the canvas and the pictures together, wired as the window wires them.
+#include "LibraryFixture.h"
+
+#include "canvas/CanvasScene.h"
+#include "library/ArchiveItem.h"
+#include "library/ArchiveList.h"
+#include "library/ThumbnailRender.h"
+
+#include <QLabel>
+#include <QPainter>
+#include <QTest>
+#include <QUndoStack>
+
+class tst_ListAndCanvas : public QObject
+{
+    Q_OBJECT
+
+private slots:
+    void init();
+    void cleanup();
+    void selectedTitleIsOnTheCanvas();
+    void newTitleShowsItsPictureAtOnce();
+    void leavingANewTitleWritesItsPictures();
+    void deletedTitleLeavesTheCanvas();
+    void picturesShowWhatTheCanvasShows();
+
+private:
+    static QRect inkIn(const QImage& image)
+    {
+        QRect ink;
+        for (int y = 0; y < image.height(); ++y) {
+            for (int x = 0; x < image.width(); ++x) {
+                if (qAlpha(image.pixel(x, y)) > 127)
+                    ink |= QRect(x, y, 1, 1);
+            }
+        }
+        return ink;
+    }
+    QString canvasTitle() const
+    {
+        return mScene->archive()
+                   ? QFileInfo(QString::fromStdString(mScene->archive()->getPath())).completeBaseName()
+                   : QString();
+    }
+    // As the window does on a template's choice.
+    void createTitle(const QString& text)
+    {
+        const auto temp = LibraryFixture::makeRecord(mFixture.makeFolder(QStringLiteral("presets")),
+                                                     QStringLiteral("p"), text);
+        mList->createArchiveFromTemplate(temp.get());
+        mScene->createThumnailPicture();
+    }
+
+    LibraryFixture mFixture;
+    std::unique_ptr<QUndoStack> mStack;
+    std::unique_ptr<QLabel> mLabel;
+    std::unique_ptr<CanvasScene> mScene;
+    std::unique_ptr<ArchiveList> mList;
+};
+
+void tst_ListAndCanvas::init()
+{
+    mStack = std::make_unique<QUndoStack>();
+    mLabel = std::make_unique<QLabel>();
+    mScene = std::make_unique<CanvasScene>(std::make_unique<ThumbnailRender>());
+    mScene->setSceneRect(0, 0, 1280, 720);
+    mList = std::make_unique<ArchiveList>(mLabel.get(), false);
+    mList->setFixedSize(549, 997);
+    mList->setMainScene(mScene.get());
+    for (auto signal : {&ArchiveList::deleteCommandSignal, &ArchiveList::pasteCommandSignal,
+                        &ArchiveList::focusCommandSignal})
+        connect(mList.get(), signal, mStack.get(), &QUndoStack::push);
+    connect(mList.get(), &ArchiveList::signalUpdateCanvas, mScene.get(), &CanvasScene::slotUpdateArchive);
+    connect(mList.get(), &ArchiveList::itemSetDefaultState, mScene.get(),
+            &CanvasScene::slotMakeSceneThumnail);
+    connect(mScene.get(), &CanvasScene::signalSaveOk, mList.get(), &ArchiveList::refreshBaseItem);
+    mList->show();
+}
+
+void tst_ListAndCanvas::cleanup()
+{
+    mStack.reset();
+    mList.reset();
+    mScene.reset();
+}
+
+void tst_ListAndCanvas::selectedTitleIsOnTheCanvas()
+{
+    const QString folder = mFixture.makeFolder(QStringLiteral("select"));
+    LibraryFixture::fillFolder(folder, {QStringLiteral("a"), QStringLiteral("b")});
+    mList->refreshArchiveListInFile(folder, QStringLiteral("b.xml"));
+    QCOMPARE(canvasTitle(), QStringLiteral("b"));
+    QTest::mouseClick(mList->getWidgetItem(0), Qt::LeftButton, Qt::NoModifier, QPoint(20, 20));
+    QCOMPARE(canvasTitle(), QStringLiteral("a"));
+    mStack->undo();
+    QCOMPARE(canvasTitle(), QStringLiteral("b"));
+    QVERIFY(mScene->isEditFinish()); // nothing was changed, so no picture is made
+}
+
+void tst_ListAndCanvas::newTitleShowsItsPictureAtOnce()
+{
+    mList->refreshArchiveList(mFixture.makeFolder(QStringLiteral("new")));
+    createTitle(QStringLiteral("速報 New"));
+    QCOMPARE(mList->count(), 1);
+    const ArchiveItem* item = mList->getWidgetItem(0);
+    QCOMPARE(item->textLines().front(), QStringLiteral("速報 New"));
+    QCOMPARE(canvasTitle(), QString::fromStdString(item->getArchiveData()->getName()));
+    QVERIFY(!QFile::exists(item->getArchiveData()->getFullPathOfThumbnailSmall()));
+}
+
+void tst_ListAndCanvas::leavingANewTitleWritesItsPictures()
+{
+    const QString folder = mFixture.makeFolder(QStringLiteral("leave"));
+    LibraryFixture::fillFolder(folder, {QStringLiteral("a")});
+    mList->refreshArchiveList(folder);
+    createTitle(QStringLiteral("Left"));
+    const QString stem = canvasTitle();
+    QVERIFY(stem != QStringLiteral("a"));
+    mList->selectArchive(mList->count() - 1 - mList->getItemIndex(mList->getSelectedArchive()));
+    QCOMPARE(canvasTitle(), QStringLiteral("a"));
+    QTRY_VERIFY_WITH_TIMEOUT(mScene->isEditFinish(), 20000);
+    for (const char* suffix : {"_1920.png", "_960.png", "_240.png", "_240S.png"})
+        QVERIFY(!QImage(folder + QLatin1Char('/') + stem + QLatin1String(suffix)).isNull());
+}
+
+void tst_ListAndCanvas::deletedTitleLeavesTheCanvas()
+{
+    const QString folder = mFixture.makeFolder(QStringLiteral("delete"));
+    mList->refreshArchiveList(folder);
+    createTitle(QStringLiteral("Gone"));
+    mStack->undo();
+    QVERIFY(mList->isEmpty());
+    QVERIFY(mScene->getTextItemList().isEmpty());
+    mList->synchronizationFolderFile();
+    QVERIFY(QDir(folder).entryList({QStringLiteral("*.xml")}, QDir::Files).isEmpty());
+    mStack->redo();
+    QCOMPARE(mScene->getTextItemList().size(), 1);
+}
+
+void tst_ListAndCanvas::picturesShowWhatTheCanvasShows()
+{
+    const QString folder = mFixture.makeFolder(QStringLiteral("same"));
+    const auto archive = LibraryFixture::makeRecord(folder, QStringLiteral("t"), QString());
+    std::vector<TText*> texts;
+    for (const int align : {-1, 0, 1}) {
+        TText* text =
+            LibraryFixture::makeText(align == 0 ? QStringLiteral("two\nlines") : QStringLiteral("Words"),
+                                     align + 2, 200, 150.0F * static_cast<float>(align + 2));
+        text->setTextAlign(align);
+        for (TextStyle* style : text->textItems())
+            style->setIsTextEdge(align == 0);
+        texts.push_back(text);
+    }
+    archive->setText(texts);
+    QVERIFY(ArchiveController().saveNewArchive(folder, archive.get()));
+    mScene->slotUpdateArchive(archive.get());
+    QImage canvas(1280, 720, QImage::Format_ARGB32_Premultiplied);
+    canvas.fill(Qt::transparent);
+    QPainter painter(&canvas);
+    painter.setRenderHint(QPainter::Antialiasing);
+    mScene->render(&painter, QRectF(), QRectF(0, 0, 1280, 720));
+    painter.end();
+
+    mScene->saveArchiveFlag();
+    mScene->slotMakeSceneThumnail();
+    QTRY_VERIFY_WITH_TIMEOUT(mScene->isEditFinish(), 20000);
+    const QRect onCanvas = inkIn(canvas);
+    const QRect onAir = inkIn(QImage(folder + QStringLiteral("/t_1920.png")));
+    QVERIFY(!onCanvas.isEmpty());
+    // Both rasters round glyph places on their own.
+    QVERIFY(qAbs(onAir.left() - onCanvas.left() * 1.5) <= 4);
+    QVERIFY(qAbs(onAir.top() - onCanvas.top() * 1.5) <= 4);
+    QVERIFY(qAbs(onAir.right() - onCanvas.right() * 1.5) <= 8);
+    QVERIFY(qAbs(onAir.bottom() - onCanvas.bottom() * 1.5) <= 6);
+}
+
+QTEST_MAIN(tst_ListAndCanvas)
+#include "tst_listandcanvas.moc"
