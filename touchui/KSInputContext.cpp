@@ -166,6 +166,10 @@ KSInputContext::KSInputContext(std::unique_ptr<QPlatformInputContext> inner) : m
     if (s_instance == nullptr) {
         s_instance = this;
     }
+    if (m_inner != nullptr) {
+        // The X11 platform looks for the method that composes by its name, to hand it the keyboard's context.
+        setObjectName(m_inner->objectName());
+    }
     INIT_LOGGING(L"KS2Titler");
 }
 
@@ -678,6 +682,14 @@ void KSInputContext::update(Qt::InputMethodQueries queries)
 {
     if (m_inner != nullptr) {
         m_inner->update(queries);
+    }
+}
+
+void KSInputContext::setXkbContext(struct xkb_context* context)
+{
+    if (m_inner != nullptr) {
+        QMetaObject::invokeMethod(m_inner.get(), "setXkbContext", Qt::DirectConnection,
+                                  Q_ARG(struct xkb_context*, context));
     }
 }
 

@@ -20,6 +20,7 @@ class QGraphicsTextItem;
 class QGraphicsView;
 class QInputMethodEvent;
 class QLineEdit;
+struct xkb_context;
 
 // Describes the focused field to the soft keyboard service, and applies the strings, keys and cursor
 // positions that the service sends back. The field is a QLineEdit, an editable QComboBox or a text item of a
@@ -118,6 +119,8 @@ public:
     void hideInputPanel() override;
     bool isInputPanelVisible() const override;
     void setFocusObject(QObject* object) override;
+    // Called by name while the X11 platform starts, for an inner method that composes.
+    Q_INVOKABLE void setXkbContext(struct xkb_context* context);
     bool event(QEvent* event) override;
     bool eventFilter(QObject* object, QEvent* event) override;
 

@@ -13,7 +13,7 @@ namespace
 using Surfaces::Button;
 
 const QSize TOOL_ICON(120, 67); // the icon stands in the upper part, over the label
-constexpr QPoint TOOL_ICON_AT(42, 5);
+constexpr QPoint TOOL_ICON_AT(42, 6);
 
 struct ButtonRow {
     Button state;

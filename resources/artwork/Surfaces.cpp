@@ -65,7 +65,11 @@ void Surfaces::button(QPainter& painter, const QSize& size, Button state)
 
 void Surfaces::toolPlate(QPainter& painter, const QSize& size, Button state)
 {
-    drawFace(painter, size, faceOf(state), Tokens::RADIUS_PANE);
+    // The bar begins at the very edge of the pane: the plate keeps off it.
+    constexpr int TOP = 3;
+    constexpr int BOTTOM = 1;
+    painter.translate(0, TOP);
+    drawFace(painter, QSize(size.width(), size.height() - TOP - BOTTOM), faceOf(state), Tokens::RADIUS_PANE);
 }
 
 void Surfaces::pane(QPainter& painter, const QSize& size, const QColor& fill)

@@ -183,6 +183,7 @@ private slots:
     void deleteAndUndo();
     void moveAndUndo();
     void undoWithoutObject();
+    void undoneObjectLeavesNoStep();
 
     void tapSelectsThenEdits();
     void secondTapPlacesTheCursor();
@@ -735,6 +736,23 @@ void tst_canvasscene::undoWithoutObject()
     canvas.stack.undo();
     QCOMPARE(canvas.text(1)->toPlainText(), QStringLiteral("abc"));
     QVERIFY(canvas.saved());
+}
+
+void tst_canvasscene::undoneObjectLeavesNoStep()
+{
+    Canvas canvas;
+    canvas.open({});
+    canvas.scene->slotInsertNewTextItem();
+    GraphicsText* item = canvas.text(1);
+    typeText(*item, "abc");
+    canvas.stack.undo();
+    QCOMPARE(canvas.text(1), nullptr);
+    // Typing that was under way, and a finger that rests, have nothing more to say.
+    item->pushLastEditTextIntoStack();
+    item->slotLongPressed();
+    QCOMPARE(canvas.stack.count(), 1);
+    QVERIFY(canvas.stack.canRedo());
+    QVERIFY(!item->textCursor().hasSelection());
 }
 
 void tst_canvasscene::tapSelectsThenEdits()

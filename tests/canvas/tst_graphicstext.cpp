@@ -120,6 +120,7 @@ private slots:
     void everyScriptLeavesInk();
     void frames();
     void unpaintedCaretOfDocument();
+    void paintedInAViewInsideAWindow();
     void caretPoints();
     void hostileRecord();
 };
@@ -851,6 +852,26 @@ void tst_graphicstext::unpaintedCaretOfDocument()
     QVERIFY(count(selected, QGuiApplication::palette().color(QPalette::Inactive, QPalette::Highlight)) +
                 count(selected, QGuiApplication::palette().color(QPalette::Active, QPalette::Highlight)) >
             100);
+}
+
+void tst_graphicstext::paintedInAViewInsideAWindow()
+{
+    TText record = makeRecord("HHHH");
+    record.setXValue(900.0F);
+    Pair pair(record);
+    const int whole = count(picture(pair.scene), QColor(255, 255, 255));
+    QVERIFY(whole > 500);
+    // What is shown does not depend on where the view stands in its window.
+    QWidget window;
+    window.setStyleSheet("background-color:black");
+    window.resize(1900, 850);
+    QGraphicsView view(&pair.scene, &window);
+    view.setFrameStyle(0);
+    view.setRenderHint(QPainter::Antialiasing);
+    view.setGeometry(600, 100, 1280, 720);
+    window.show();
+    QVERIFY(QTest::qWaitForWindowExposed(&window));
+    QVERIFY(count(window.grab().toImage(), QColor(255, 255, 255)) >= whole * 9 / 10);
 }
 
 void tst_graphicstext::caretPoints()

@@ -1,0 +1,254 @@
+// The input context on an X server: keys that really come from one. Run under Xvfb.
+#include "messaging/services/ISoftKeyBoardController.h"
+#include "touchui/KSAppEventFilter.h"
+#include "touchui/KSInputContext.h"
+#include "touchui/KSInputFocusManager.h"
+
+#include <QApplication>
+#include <QLineEdit>
+#include <QProcess>
+#include <QPushButton>
+#include <QTest>
+#include <QVBoxLayout>
+
+#define XK_MISCELLANY
+#define XK_XKB_KEYS
+#include <X11/Xlib.h>
+#include <X11/keysymdef.h>
+#include <algorithm>
+// Xlib's names that clash with Qt's.
+#undef KeyPress
+#undef KeyRelease
+#undef FocusIn
+#undef FocusOut
+#undef None
+#undef Bool
+#undef Status
+#undef CursorShape
+
+using namespace SubCommonDefine;
+
+namespace
+{
+
+// A window that is shown before the window manager is up gets the focus late or loses it again.
+bool windowManagerIsUp()
+{
+    Display* display = XOpenDisplay(nullptr);
+    if (display == nullptr) {
+        return false;
+    }
+    Atom type = 0;
+    int format = 0;
+    unsigned long count = 0;
+    unsigned long rest = 0;
+    unsigned char* data = nullptr;
+    XGetWindowProperty(display, DefaultRootWindow(display),
+                       XInternAtom(display, "_NET_SUPPORTING_WM_CHECK", 0), 0, 1, 0, AnyPropertyType, &type,
+                       &format, &count, &rest, &data);
+    if (data != nullptr) {
+        XFree(data);
+    }
+    XCloseDisplay(display);
+    return count == 1;
+}
+
+// Gives letters that the keyboard lacks a key of their own. A tool that maps each of them for the moment of
+// its key press may have taken it away again before the program has read the map.
+bool addKeys(const QList<KeySym>& wanted)
+{
+    Display* display = XOpenDisplay(nullptr);
+    if (display == nullptr) {
+        return false;
+    }
+    int lowest = 0;
+    int highest = 0;
+    XDisplayKeycodes(display, &lowest, &highest);
+    int perKey = 0;
+    KeySym* map = XGetKeyboardMapping(display, static_cast<KeyCode>(lowest), highest - lowest + 1, &perKey);
+    qsizetype next = 0;
+    for (int code = highest; code >= lowest && next < wanted.size(); --code) {
+        const KeySym* symbols = map + static_cast<qsizetype>(code - lowest) * perKey;
+        if (std::all_of(symbols, symbols + perKey, [](KeySym symbol) { return symbol == 0; })) {
+            KeySym symbol = wanted.at(next);
+            XChangeKeyboardMapping(display, code, 1, &symbol, 1);
+            ++next;
+        }
+    }
+    XFree(map);
+    XCloseDisplay(display);
+    return next == wanted.size();
+}
+
+class FakeService : public ISoftKeyBoardController
+{
+public:
+    void show(tagSoftKeyBoardInitData) override { ++shown; }
+    void close() override { ++closed; }
+    void dummyClose() override {}
+    void simpleClose() override {}
+    void sendKey(tagSoftKeyBoardKeyData key) override
+    {
+        // The service sends a key back, which is how it reaches the field.
+        keys.append(key);
+        KSInputContext::instance()->sendKey(key);
+    }
+    void sendLimitInfo(taLimitInfo) override {}
+    void closeLimitBalloon() override {}
+    void showMask() override {}
+    void hideMask() override {}
+    void registerCallBack(ISoftKeyBoardControllerCallBack*) override {}
+
+    QList<tagSoftKeyBoardKeyData> keys;
+    int shown = 0;
+    int closed = 0;
+};
+
+} // namespace
+
+class TestInputContextX11 : public QObject
+{
+    Q_OBJECT
+
+private Q_SLOTS:
+    void initTestCase();
+    void cleanupTestCase();
+    void keysWorkWhileClosed();
+    void eachKeyIsForwardedOnce();
+    void keysWorkAgainWithoutTheService();
+    void requestWithoutAFieldGivesBackTheFocus();
+    void deadWindowDoesNoHarm();
+
+private:
+    void press(const QStringList& arguments);
+
+    QProcess m_windowManager;
+    KSAppEventFilter m_filter;
+    FakeService m_service;
+    std::unique_ptr<QWidget> m_window;
+    std::unique_ptr<QWidget> m_second;
+    QLineEdit* m_edit = nullptr;
+};
+
+void TestInputContextX11::initTestCase()
+{
+    QCOMPARE(QGuiApplication::platformName(), QStringLiteral("xcb"));
+    m_windowManager.start(QStringLiteral("openbox"), {QStringLiteral("--sm-disable")});
+    QVERIFY(m_windowManager.waitForStarted());
+    QTRY_VERIFY(windowManagerIsUp());
+    constexpr KeySym UNICODE = 0x1000000;
+    QList<KeySym> symbols{XK_dead_acute};
+    for (const QChar letter : QStringLiteral("速報속보")) {
+        symbols.append(UNICODE + letter.unicode());
+    }
+    QVERIFY(addKeys(symbols));
+    qApp->setObjectName(QStringLiteral("Titler"));
+    qApp->installEventFilter(&m_filter);
+    QVERIFY(KSInputContext::instance() != nullptr);
+    KSInputContext::instance()->setKeyBoardController(&m_service);
+    m_window = std::make_unique<QWidget>();
+    auto* layout = new QVBoxLayout(m_window.get());
+    auto* button = new QPushButton(QStringLiteral("&a"));
+    m_edit = new QLineEdit;
+    layout->addWidget(button);
+    layout->addWidget(m_edit);
+    m_window->resize(300, 200);
+    m_window->show();
+    m_window->activateWindow();
+    QVERIFY(QTest::qWaitForWindowActive(m_window.get()));
+    m_edit->setFocus();
+}
+
+void TestInputContextX11::cleanupTestCase()
+{
+    m_second.reset();
+    m_window.reset();
+    KSInputContext::instance()->setKeyBoardController(nullptr);
+    m_windowManager.terminate();
+    QVERIFY(m_windowManager.waitForFinished());
+}
+
+void TestInputContextX11::press(const QStringList& arguments)
+{
+    // Letters that the keyboard lacks are mapped while they are typed, which only a running event loop
+    // follows.
+    QProcess tool;
+    tool.start(QStringLiteral("xdotool"), arguments);
+    QTRY_COMPARE(tool.state(), QProcess::NotRunning);
+    QCOMPARE(tool.exitCode(), 0);
+}
+
+void TestInputContextX11::keysWorkWhileClosed()
+{
+    press({QStringLiteral("key"), QStringLiteral("a"), QStringLiteral("b")});
+    QTRY_COMPARE(m_edit->text(), QStringLiteral("ab"));
+    // A dead key and a letter: the composition is not lost.
+    press({QStringLiteral("key"), QStringLiteral("dead_acute"), QStringLiteral("e")});
+    QTRY_COMPARE(m_edit->text(), QStringLiteral("abé"));
+    QVERIFY(m_service.keys.isEmpty());
+    QVERIFY(KSInputContext::isSoftKeyboardClosed());
+}
+
+void TestInputContextX11::eachKeyIsForwardedOnce()
+{
+    m_edit->clear();
+    QTest::mouseClick(m_edit, Qt::LeftButton);
+    QCOMPARE(m_service.shown, 1);
+    press({QStringLiteral("type"), QStringLiteral("速報 속보")});
+    QTRY_COMPARE(m_edit->text(), QStringLiteral("速報 속보"));
+    QString forwarded;
+    for (const tagSoftKeyBoardKeyData& key : std::as_const(m_service.keys)) {
+        forwarded += QString::fromStdWString(key.text);
+    }
+    QCOMPARE(forwarded, QStringLiteral("速報 속보"));
+    press({QStringLiteral("key"), QStringLiteral("BackSpace")});
+    QTRY_COMPARE(m_edit->text(), QStringLiteral("速報 속"));
+    QCOMPARE(m_service.shown, 1);
+}
+
+void TestInputContextX11::keysWorkAgainWithoutTheService()
+{
+    m_edit->clear();
+    m_service.keys.clear();
+    KSInputContext::instance()->setKeyBoardController(nullptr);
+    press({QStringLiteral("key"), QStringLiteral("x"), QStringLiteral("y")});
+    QTRY_COMPARE(m_edit->text(), QStringLiteral("xy"));
+    QVERIFY(m_service.keys.isEmpty());
+    KSInputContext::instance()->setKeyBoardController(&m_service);
+}
+
+void TestInputContextX11::requestWithoutAFieldGivesBackTheFocus()
+{
+    m_second = std::make_unique<QWidget>();
+    m_second->resize(100, 100);
+    m_second->show();
+    m_second->activateWindow();
+    QVERIFY(QTest::qWaitForWindowActive(m_second.get()));
+    KSInputContext* context = KSInputContext::instance();
+    context->setWindowID(m_window->winId());
+    const QEvent request(QEvent::RequestSoftwareInputPanel);
+    QVERIFY(!context->filterEvent(&request));
+    QTRY_COMPARE(KSInputFocusManager::getInputFocusWindow(), static_cast<unsigned long>(m_window->winId()));
+    // A field in the other window takes it there.
+    QTRY_VERIFY(m_window->isActiveWindow());
+    context->setFocusWidget(m_second.get());
+    QTRY_COMPARE(KSInputFocusManager::getInputFocusWindow(), static_cast<unsigned long>(m_second->winId()));
+}
+
+void TestInputContextX11::deadWindowDoesNoHarm()
+{
+    const unsigned long before = KSInputFocusManager::getInputFocusWindow();
+    KSInputFocusManager::setInputFocusWindow(0x7ffffff);
+    QCOMPARE(KSInputFocusManager::getInputFocusWindow(), before);
+}
+
+int main(int argc, char** argv)
+{
+    KSInputContext::install();
+    QApplication app(argc, argv);
+    TestInputContextX11 test;
+    QTEST_SET_MAIN_SOURCE_PATH
+    return QTest::qExec(&test, argc, argv);
+}
+
+#include "tst_inputcontextx11.moc"
