@@ -143,4 +143,27 @@
         <translation>取消</translation>
     </message>
 </context>
+<context>
+    <name>ArchiveMenu</name>
+    <message>
+        <source>Create New</source>
+        <translation>新建</translation>
+    </message>
+    <message>
+        <source>Copy</source>
+        <translation>拷贝</translation>
+    </message>
+    <message>
+        <source>Paste</source>
+        <translation>粘贴</translation>
+    </message>
+    <message>
+        <source>Delete</source>
+        <translation>删除</translation>
+    </message>
+    <message>
+        <source>Save as Template</source>
+        <translation>存为模板</translation>
+    </message>
+</context>
 </TS>

@@ -143,4 +143,27 @@
         <translation>Cancel</translation>
     </message>
 </context>
+<context>
+    <name>ArchiveMenu</name>
+    <message>
+        <source>Create New</source>
+        <translation>Create New</translation>
+    </message>
+    <message>
+        <source>Copy</source>
+        <translation>Copy</translation>
+    </message>
+    <message>
+        <source>Paste</source>
+        <translation>Paste</translation>
+    </message>
+    <message>
+        <source>Delete</source>
+        <translation>Delete</translation>
+    </message>
+    <message>
+        <source>Save as Template</source>
+        <translation>Save as Template</translation>
+    </message>
+</context>
 </TS>
