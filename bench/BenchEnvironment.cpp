@@ -1,6 +1,7 @@
 #include "bench/BenchEnvironment.h"
 
 #include <QDir>
+#include <QFile>
 #include <QFileInfo>
 #include <unistd.h>
 
@@ -29,6 +30,9 @@ BenchEnvironment::BenchEnvironment()
     for (const char* name :
          {"K2SYS_AC_DATA", "K2SYS_LOG_DIR", "HOME", "XDG_DATA_HOME", "XDG_CONFIG_HOME", "XDG_RUNTIME_DIR"})
         qputenv(name, makeFolder(QString::fromLatin1(name)).toLocal8Bit());
+    const QString runtime = makeFolder(QStringLiteral("runtime"));
+    QFile::setPermissions(runtime, QFile::ReadOwner | QFile::WriteOwner | QFile::ExeOwner);
+    qputenv("XDG_RUNTIME_DIR", runtime.toLocal8Bit());
     qunsetenv("K2SYS_AC_ROOT");
     qunsetenv("K2SYS_FS_REMAIN");
     qputenv("K2SYS_PORT_OFFSET",

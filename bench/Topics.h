@@ -9,6 +9,8 @@ namespace Topics
 
 void addMessaging(PairList& list);
 void addPictures(PairList& list, const BenchEnvironment& environment);
+void addRendering(PairList& list, const BenchEnvironment& environment);
+void addTyping(PairList& list);
 void addTitleFiles(PairList& list, const BenchEnvironment& environment);
 
 } // namespace Topics

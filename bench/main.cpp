@@ -46,7 +46,9 @@ int runPairs(std::vector<char*> arguments, const BenchEnvironment& environment)
         return 2;
 
     PairList list;
+    Topics::addRendering(list, environment);
     Topics::addPictures(list, environment);
+    Topics::addTyping(list);
     Topics::addTitleFiles(list, environment);
     Topics::addMessaging(list);
     PairReporter reporter(list);
