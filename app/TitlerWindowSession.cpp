@@ -125,7 +125,7 @@ void TitlerWindow::closeTitlerMainWindow()
         close();
     } else {
         hide();
-        mCanvasScene->clear();
+        mCanvasScene->clearCanvas();
         mArchiveList->cleanArchiveList();
         mArchiveList->clearCopyArchive();
     }

@@ -93,10 +93,23 @@ void CanvasScene::savePreviousArchiveInfo()
         disableTextPropertyArea();
     }
     m_defaultFontUsed = false;
+    removeAllItems();
+}
+
+// The pointers go before what they point to.
+void CanvasScene::removeAllItems()
+{
     m_texts->listed().clear();
     m_safeArea->forget();
     m_currentPixmapItem = nullptr;
-    clear();
+    m_itemForKeyboard = nullptr;
+    QGraphicsScene::clear();
+}
+
+void CanvasScene::clearCanvas()
+{
+    removeAllItems();
+    m_archive.reset();
 }
 
 bool CanvasScene::archiveIsNull(const Archive* archive)

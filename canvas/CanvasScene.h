@@ -58,6 +58,8 @@ public:
     void saveArchiveFlag() { m_thumbnailNeeded = true; }
     void createThumnailPicture();
     bool isEditFinish() const;
+    // Shows no title. Nothing is saved.
+    void clearCanvas();
 
     bool itemIsEditorInteraction() const;
     bool itemIsSelectionMode() const;
@@ -152,6 +154,7 @@ protected:
 
 private:
     void savePreviousArchiveInfo();
+    void removeAllItems();
     bool archiveIsNull(const Archive* archive);
     void reportMissingFamily();
     GraphicsText* buildPair(TText* record);

@@ -4,7 +4,6 @@
 #include "document/DocumentConstants.h"
 #include "document/TitleParser.h"
 #include "document/TitleParserUtility.h"
-#include "support/FileSyncQueue.h"
 #include "support/XmlFile.h"
 
 #include <cstdio>
@@ -64,8 +63,7 @@ int TitleParser::writeFileOrderInFolder(std::string folder, std::vector<ArchiveO
     // the start makes a new one for it from what the folder holds.
     const std::string path = folder + STR_SLASH + ORDER_FILEPATH;
     std::remove(path.c_str());
-    if (document.SaveFile(path.c_str()))
-        FileSyncQueue::enqueue(path);
+    XmlFile::saveInPlace(document, path);
     return 1;
 }
 

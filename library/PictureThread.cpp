@@ -7,6 +7,7 @@
 #include "library/TitlerUtility.h"
 
 #include <QMutexLocker>
+#include <future>
 #include <string>
 
 const QSize PictureThread::THUMBNAIL_SMALL_SIZE(240, 135);
@@ -85,12 +86,14 @@ void PictureThread::saveArchiveThumnail(const Archive& archive, const QImage& bi
     const QString blackPath = picturePath(archive, archive.getThumbnailBlack());
     const QString smallPath = picturePath(archive, archive.getThumbnailSmall());
 
-    // A picture that cannot be written is passed over: the others still help.
+    // Four fifths of the work are in the big picture, which has a core of its own meanwhile. A picture that
+    // cannot be written is passed over: the others still help.
+    std::future<bool> bigSaved = std::async([&big, &bigPath] { return PngWriter::save(big, bigPath); });
     PngWriter::save(middle, middlePath);
-    PngWriter::save(big, bigPath);
     ImageResizer().resizeImageToThumbnail(middle, blackPath.toStdWString(), smallPath.toStdWString(),
                                           static_cast<unsigned>(THUMBNAIL_SMALL_SIZE.width()),
                                           static_cast<unsigned>(THUMBNAIL_SMALL_SIZE.height()));
+    bigSaved.wait();
     if (ITitleChangeReporter* reporter = ITitleChangeReporter::instance())
         reporter->changeTitlerStatus(FileManagerDefine::TITLE_PICTURES_CHANGED,
                                      QString::fromStdString(archive.getPath()));

@@ -244,16 +244,13 @@ class Appliance(Process):
         with self.changed:
             return len(self.events)
 
-    def find(self, start, wanted):
+    def since(self, start):
+        """The events since start."""
         with self.changed:
-            return next((event for event in self.events[start:] if wanted(event)), None)
+            return self.events[start:]
 
-    def wait_event(self, name, timeout=20, start=0, **fields):
-        """The first event since start with this name and these values."""
-
-        def wanted(event):
-            return event.get("event") == name and all(event.get(key) == value for key, value in fields.items())
-
+    def wait_for(self, wanted, timeout, start, what):
+        """The first event since start for which wanted(event) is true."""
         deadline = time.monotonic() + timeout
         with self.changed:
             while True:
@@ -262,8 +259,14 @@ class Appliance(Process):
                         return event
                 left = deadline - time.monotonic()
                 if left <= 0:
-                    raise SessionError(f"no event {name} {fields} in {timeout} s; got {self.events[start:]}")
+                    raise SessionError(f"waited {timeout} s in vain for {what}; got {self.events[start:]}")
                 self.changed.wait(left)
+
+    def wait_event(self, name, timeout, start, **fields):
+        """The first event since start with this name and these values."""
+        return self.wait_for(
+            lambda event: event.get("event") == name and all(event.get(key) == fields[key] for key in fields),
+            timeout, start, f"{name} {fields}")
 
     def stop(self, timeout=10):
         if self.running():

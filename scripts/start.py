@@ -3,7 +3,7 @@
 
 With a display the window opens there and the programs run until one of them or this script is ended. Without one they
 run on an Xvfb; a screenshot is left in build/run/ and all ends, unless --keep is given.
-Lines typed on standard input go to the appliance as commands ("help" lists them).
+Lines typed on standard input go to the appliance as commands (see README.md).
 """
 import argparse
 import os
@@ -75,7 +75,8 @@ def start(build, folder, environment, title, display):
     session.wait_listening(appliance, session.SUB_PANEL_PORT + offset)
     titler = session.start_titler(build, os.path.join(folder, "titler.log"), environment)
     session.wait_listening(titler, session.TITLER_PORT + offset)
-    appliance.command(f"edit {title}")
+    appliance.command("wait-titler")
+    appliance.command(f'edit "{title}"')
     if display:
         def shown():
             titler.check()

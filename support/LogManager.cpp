@@ -25,8 +25,8 @@ std::wstring gProcName;
 
 std::string logFolder()
 {
-    char folder[PATH_MAX] = "/var/log";
-    if (k2sys_log_dir != nullptr && k2sys_log_dir(folder, sizeof folder) < 0) {
+    char folder[PATH_MAX];
+    if (k2sys_log_dir(folder, sizeof folder) < 0) {
         return "/var/log";
     }
     return folder;

@@ -1,6 +1,7 @@
 #include "support/XmlFile.h"
 
 #include "support/AtomicFile.h"
+#include "support/FileSyncQueue.h"
 #include "support/XmlFileGuard.h"
 
 #include <cstdio>
@@ -114,24 +115,52 @@ private:
         mBytes += quote;
     }
 
+    // As TiXmlBase::EncodeString, but for "&#x" in a text, which that one writes as it stands and no reader
+    // would read back.
     void append(const std::string& text)
     {
-        for (const char c : text) {
-            if (static_cast<unsigned char>(c) < 32 || c == '&' || c == '<' || c == '>' || c == '"' ||
-                c == '\'') {
-                TiXmlBase::EncodeString(text, &mEncoded);
-                mBytes += mEncoded;
-                mEncoded.clear();
-                return;
+        static constexpr char DIGITS[] = "0123456789ABCDEF";
+        std::size_t done = 0;
+        for (std::size_t i = 0; i < text.size(); ++i) {
+            const auto c = static_cast<unsigned char>(text[i]);
+            if (!isReserved(c))
+                continue;
+            mBytes.append(text, done, i - done);
+            done = i + 1;
+            switch (c) {
+            case '&':
+                mBytes += "&amp;";
+                break;
+            case '<':
+                mBytes += "&lt;";
+                break;
+            case '>':
+                mBytes += "&gt;";
+                break;
+            case '"':
+                mBytes += "&quot;";
+                break;
+            case '\'':
+                mBytes += "&apos;";
+                break;
+            default:
+                mBytes += "&#x";
+                mBytes += DIGITS[c >> 4];
+                mBytes += DIGITS[c & 15];
+                mBytes += ';';
             }
         }
-        mBytes += text;
+        mBytes.append(text, done);
+    }
+
+    static bool isReserved(unsigned char c)
+    {
+        return c < 32 || c == '&' || c == '<' || c == '>' || c == '"' || c == '\'';
     }
 
     void indent(int depth) { mBytes.append(static_cast<std::size_t>(depth) * 4, ' '); }
 
     std::string mBytes;
-    std::string mEncoded;
 };
 
 } // namespace
@@ -154,6 +183,19 @@ bool XmlFile::load(const std::string& path, TiXmlDocument& document)
 bool XmlFile::save(const TiXmlDocument& document, const std::string& path)
 {
     return AtomicFile::write(path, toBytes(document));
+}
+
+bool XmlFile::saveInPlace(const TiXmlDocument& document, const std::string& path)
+{
+    const std::string bytes = toBytes(document);
+    std::FILE* const file = std::fopen(path.c_str(), "we");
+    if (!file)
+        return false;
+    const bool isWritten = std::fwrite(bytes.data(), 1, bytes.size(), file) == bytes.size();
+    if (std::fclose(file) != 0 || !isWritten)
+        return false;
+    FileSyncQueue::enqueue(path);
+    return true;
 }
 
 std::string XmlFile::toBytes(const TiXmlDocument& document)

@@ -17,6 +17,10 @@ public:
     // does.
     static bool save(const TiXmlDocument& document, const std::string& path);
 
+    // Writes to the file itself, for the one whose readers must rather find no file than an old one. Cut off,
+    // it leaves a part.
+    static bool saveInPlace(const TiXmlDocument& document, const std::string& path);
+
     // The bytes that SaveFile writes.
     static std::string toBytes(const TiXmlDocument& document);
 };

@@ -86,6 +86,29 @@ private:
         return false;
     }
 
+    // For a character reference without digits or end TinyXML looks ahead past quotes and tags, and would see
+    // another structure than this scan.
+    static bool hasGoodReferences(const char* p, const char* end)
+    {
+        while ((p = static_cast<const char*>(std::memchr(p, '&', static_cast<std::size_t>(end - p))))) {
+            if (end - ++p < 1 || *p != '#')
+                continue;
+            const bool isHexadecimal = end - ++p > 0 && *p == 'x';
+            p += isHexadecimal;
+            const char* const digits = p;
+            while (p != end && (isHexadecimal ? isHexadecimalDigit(*p) : *p >= '0' && *p <= '9'))
+                ++p;
+            if (p == digits || p == end || *p != ';')
+                return false;
+        }
+        return true;
+    }
+
+    static bool isHexadecimalDigit(char c)
+    {
+        return (c >= '0' && c <= '9') || (c >= 'a' && c <= 'f') || (c >= 'A' && c <= 'F');
+    }
+
     // Outside the root TinyXML ends quietly at the first thing that is no markup.
     bool scanTopLevel()
     {
@@ -103,7 +126,7 @@ private:
     {
         const auto* next =
             static_cast<const char*>(std::memchr(mPos, '<', static_cast<std::size_t>(mEnd - mPos)));
-        if (!next)
+        if (!next || !hasGoodReferences(mPos, next))
             return false;
         mPos = next;
         if (!startsWith("</"))
@@ -196,7 +219,8 @@ private:
             return false;
         if (*mPos == '"' || *mPos == '\'') {
             const char quote = *mPos++;
-            return skipPast(quote);
+            const char* const value = mPos;
+            return skipPast(quote) && hasGoodReferences(value, mPos - 1);
         }
         while (mPos != mEnd && !isSpace(*mPos) && *mPos != '/' && *mPos != '>') {
             if (*mPos == '"' || *mPos == '\'')

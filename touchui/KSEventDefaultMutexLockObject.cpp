@@ -32,7 +32,7 @@ KSEventDefaultMutexLockObject* KSEventDefaultMutexLockObject::createFactory(KSAp
 }
 
 KSEventDefaultMutexLockObject::KSEventDefaultMutexLockObject(KSAppEventFilter* filter, QObject* parent)
-    : KSLockObject(parent), m_filter(filter)
+    : KSLockObject(parent), m_timer(this), m_filter(filter)
 {
     m_timer.setSingleShot(true);
     connect(&m_timer, &QTimer::timeout, this, &KSEventDefaultMutexLockObject::lockedTimeout);

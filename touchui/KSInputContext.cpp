@@ -136,25 +136,6 @@ QLineEdit* lineEditOf(QWidget* widget)
     return qobject_cast<QLineEdit*>(widget);
 }
 
-tagSoftKeyBoardInitData describe(QWidget* widget)
-{
-    if (auto* view = qobject_cast<QGraphicsView*>(widget)) {
-        const QGraphicsTextItem* item = KSInputContext::getFocusTextItem(view);
-        return item == nullptr ? tagSoftKeyBoardInitData() : describe(item);
-    }
-    const QLineEdit* edit = lineEditOf(widget);
-    return edit == nullptr ? tagSoftKeyBoardInitData() : describe(edit);
-}
-
-bool isSame(const tagSoftKeyBoardInitData& a, const tagSoftKeyBoardInitData& b)
-{
-    return a.fieldKind == b.fieldKind && a.title == b.title && a.keyboardType == b.keyboardType &&
-           a.maxLength == b.maxLength && a.text == b.text && a.textLength == b.textLength &&
-           a.selectionStart == b.selectionStart && a.selectionEnd == b.selectionEnd &&
-           a.selectionMode == b.selectionMode && a.limitCondition == b.limitCondition &&
-           a.lastValue == b.lastValue;
-}
-
 // X11 gives the keyboard to windows, and windows of the keyboard service may have taken it.
 void giveInputFocus(unsigned long window)
 {
@@ -293,6 +274,7 @@ bool KSInputContext::filterRequestSoftwareInputPanel()
         giveInputFocus(m_windowId);
         return false;
     }
+    commit(); // keys go to the service from now on; what was being composed must not be lost
     return showForFocusWidget(getSendData());
 }
 
@@ -301,13 +283,9 @@ bool KSInputContext::showForFocusWidget(const tagSoftKeyBoardInitData& data)
     if (m_controller == nullptr) {
         return false;
     }
-    if (m_inner != nullptr) {
-        m_inner->commit(); // keys go to the service from now on; what was being composed must not be lost
-    }
     if (m_bClosed) {
         m_controller->registerCallBack(this);
     }
-    m_fieldState = data;
     m_controller->show(data);
     m_controller->closeLimitBalloon();
     setClosed(false);
@@ -336,7 +314,15 @@ void KSInputContext::setFocusWidget(QWidget* widget)
     if (widget != nullptr && widget->window()->isVisible() && widget->window()->internalWinId() != 0) {
         giveInputFocus(widget->window()->internalWinId());
     }
-    m_baseFocusWidget = widget;
+    if (m_baseFocusWidget != widget) {
+        if (m_baseFocusWidget != nullptr) {
+            m_baseFocusWidget->removeEventFilter(this);
+        }
+        if (widget != nullptr) {
+            widget->installEventFilter(this);
+        }
+        m_baseFocusWidget = widget;
+    }
 }
 
 void KSInputContext::resetFocusWidget()
@@ -402,14 +388,6 @@ tagSoftKeyBoardInitData KSInputContext::getSendData(QGraphicsTextItem* item)
     return data;
 }
 
-// After the service changed the field it knows what is in it, and need not be told.
-void KSInputContext::noteFieldState()
-{
-    if (!m_bClosed && m_pFocusWidget != nullptr) {
-        m_fieldState = describe(m_pFocusWidget.data());
-    }
-}
-
 // The keyboard window.
 
 void KSInputContext::showSoftKeyBoardWindow(tagSoftKeyBoardInitData data)
@@ -419,7 +397,6 @@ void KSInputContext::showSoftKeyBoardWindow(tagSoftKeyBoardInitData data)
     }
     m_strLimitCondition = QString::fromStdWString(data.limitCondition);
     m_controller->registerCallBack(this);
-    m_fieldState = data;
     m_controller->show(data);
     m_controller->closeLimitBalloon();
     setClosed(false);
@@ -519,7 +496,6 @@ void KSInputContext::handleInputString(const std::wstring& text, bool onEnter)
     if (auto* box = qobject_cast<QComboBox*>(getFocusWidget())) {
         handleInputStringOfQCombobox(box, string, onEnter);
     }
-    noteFieldState();
 }
 
 void KSInputContext::handleInputStringOfQGraphicsView(QGraphicsView* view, const QString& text)
@@ -602,7 +578,6 @@ void KSInputContext::sendKey(tagSoftKeyBoardKeyData data)
         const QScopedValueRollback<bool> sending(m_sendingKeyEvent, true);
         QCoreApplication::sendEvent(target, &key);
     }
-    noteFieldState();
 }
 
 void KSInputContext::sendSoftKeyBoardClosedEventToFocusWidget()
@@ -636,7 +611,6 @@ void KSInputContext::sendInputStringSelectionPos(tagSoftKeyBoardKeyTextSelection
     } else if (QLineEdit* edit = lineEditOf(getFocusWidget())) {
         setCursorSelection(pos, edit);
     }
-    noteFieldState();
 }
 
 void KSInputContext::setCursorSelection(const tagSoftKeyBoardKeyTextSelectionPos& pos, QLineEdit* edit)
@@ -714,23 +688,50 @@ void KSInputContext::invokeAction(QInputMethod::Action action, int cursorPositio
     }
 }
 
-// Qt asks after each click and each key release in a field; the service is told only of what it does not
-// know.
+// Qt asks after each click, and also after each key release, in a field. Keys must not bring back a keyboard
+// that the operator has put away, and need not show one that is up.
 void KSInputContext::showInputPanel()
 {
-    if (!m_bClosed && m_pFocusWidget != nullptr && isSame(m_fieldState, describe(m_pFocusWidget.data()))) {
+    if (m_sendingKeyEvent || m_keyReleased) {
         return;
     }
     const QEvent request(QEvent::RequestSoftwareInputPanel);
     filterEvent(&request);
 }
 
+// Qt asks when a field loses the focus, and also when Enter is pressed in it, which is decided where the key
+// is delivered. A window of another process that takes the focus, such as the keyboard itself, does not end
+// the field.
 void KSInputContext::hideInputPanel()
 {
-    if (!m_bClosed) {
-        const QEvent request(QEvent::CloseSoftwareInputPanel);
-        filterEvent(&request);
+    const bool stillInField = m_pFocusWidget != nullptr && m_pFocusWidget->hasFocus();
+    if (m_bClosed || stillInField || QGuiApplication::focusWindow() == nullptr) {
+        return;
     }
+    const QEvent request(QEvent::CloseSoftwareInputPanel);
+    filterEvent(&request);
+}
+
+// Watches the field for what its requests come from.
+bool KSInputContext::eventFilter(QObject* object, QEvent* event)
+{
+    switch (event->type()) {
+    case QEvent::KeyRelease:
+        m_keyReleased = true;
+        QMetaObject::invokeMethod(
+            this, [this] { m_keyReleased = false; }, Qt::QueuedConnection);
+        break;
+    case QEvent::KeyPress:
+    case QEvent::MouseButtonPress:
+    case QEvent::MouseButtonRelease:
+    case QEvent::TouchBegin:
+    case QEvent::TouchEnd:
+        m_keyReleased = false;
+        break;
+    default:
+        break;
+    }
+    return QPlatformInputContext::eventFilter(object, event);
 }
 
 bool KSInputContext::isInputPanelVisible() const

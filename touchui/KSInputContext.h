@@ -119,6 +119,7 @@ public:
     bool isInputPanelVisible() const override;
     void setFocusObject(QObject* object) override;
     bool event(QEvent* event) override;
+    bool eventFilter(QObject* object, QEvent* event) override;
 
     static bool m_bClosed;
     static QPointer<QWidget> m_pFocusWidget;
@@ -140,7 +141,6 @@ private:
     void sendSoftKeyBoardClosedEventToFocusWidget();
     void setCursorSelection(const SubCommonDefine::tagSoftKeyBoardKeyTextSelectionPos& pos, QLineEdit* edit);
     void setClosed(bool closed);
-    void noteFieldState();
 
     static KSInputContext* s_instance;
     std::unique_ptr<QPlatformInputContext> m_inner;
@@ -148,5 +148,5 @@ private:
     bool m_sendingKeyEvent = false;
     unsigned long m_windowId = 0;
     QPointer<QWidget> m_baseFocusWidget;
-    SubCommonDefine::tagSoftKeyBoardInitData m_fieldState; // what the service knows of the field
+    bool m_keyReleased = false; // the field is handling the release of a key
 };

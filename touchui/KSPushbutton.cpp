@@ -33,7 +33,6 @@ KSPushbutton::KSPushbutton(QWidget* parent) : TouchEventButton(parent)
 
 void KSPushbutton::init()
 {
-    setFocusPolicy(Qt::NoFocus);
     connect(this, &QAbstractButton::pressed, this, [this] { Q_EMIT pressed(m_buttonId); });
     connect(this, &TouchEventButton::signalReleased, this,
             [this](bool outside) { Q_EMIT signalReleased(outside, m_buttonId); });

@@ -19,6 +19,9 @@ TouchEventButton::TouchEventButton(const QString& text, QWidget* parent) : QPush
 void TouchEventButton::init()
 {
     setAttribute(Qt::WA_AcceptTouchEvents);
+    // Qt gives the focus at touch begin, also for a touch that is refused, and a button that loses it comes
+    // up.
+    setFocusPolicy(Qt::NoFocus);
     connect(this, &QAbstractButton::released, this, &TouchEventButton::slotEmitReleased);
 }
 

@@ -40,11 +40,6 @@ void InstanceFactory::addSender(ISender* sender)
     }
 }
 
-void InstanceFactory::removeSender(long key)
-{
-    m_senders.erase(key);
-}
-
 void InstanceFactory::setRemoteReceiver(IRemoteReceiver* receiver)
 {
     m_remoteReceiver.reset(receiver);

@@ -31,7 +31,6 @@ protected:
     ISender* findSender(long key);
     // Takes the sender over under its id. An entry that exists is kept, and the new sender deleted.
     void addSender(ISender* sender);
-    void removeSender(long key);
     // Takes the receiver over; null is allowed and deletes the one before.
     void setRemoteReceiver(IRemoteReceiver* receiver);
     IRemoteReceiver* remoteReceiver();

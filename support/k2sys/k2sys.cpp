@@ -252,20 +252,3 @@ int k2sys_get_current_timezone(char* buffer, size_t size)
     }
     return writePath(zone, buffer, size, 1) == 1 ? 1 : 0;
 }
-
-int k2sys_log_dir(char* buffer, size_t size)
-{
-    const std::string folder = environment("K2SYS_LOG_DIR");
-    return writePath(folder.empty() ? "/var/log" : folder, buffer, size, 1);
-}
-
-int k2sys_port_offset(void)
-{
-    const std::string offset = environment("K2SYS_PORT_OFFSET");
-    char* end = nullptr;
-    const long value = std::strtol(offset.c_str(), &end, 10);
-    if (offset.empty() || *end != '\0' || value < -1000 || value > 60000) {
-        return 0;
-    }
-    return static_cast<int>(value);
-}

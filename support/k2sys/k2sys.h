@@ -16,7 +16,6 @@ extern "C" {
 #endif
 
 #define K2SYS_API __attribute__((visibility("default")))
-#define K2SYS_EXTENSION __attribute__((visibility("default"), weak))
 
 /* Starts the library; may be called more than once. 0 on success. */
 K2SYS_API int k2sys_init(void);
@@ -57,15 +56,15 @@ K2SYS_API long long k2sys_fs_remain(const char* path);
 K2SYS_API int k2sys_get_current_timezone(char* buffer, size_t size);
 
 /*
- * Extensions of this library. They are weak: with a library that lacks them the symbols are null, and callers
- * go on with "/var/log" and 0.
+ * What this program asks beyond the library's interface. These are linked into the program (target
+ * titler_support), so that it also runs on the appliance's library.
  *
  * log_dir: K2SYS_LOG_DIR, else "/var/log"; returns as the paths above.
  * port_offset: K2SYS_PORT_OFFSET, else 0. Added to a TCP port at bind and connect; values outside -1000 to
  * 60000 read as 0.
  */
-K2SYS_EXTENSION int k2sys_log_dir(char* buffer, size_t size);
-K2SYS_EXTENSION int k2sys_port_offset(void);
+int k2sys_log_dir(char* buffer, size_t size);
+int k2sys_port_offset(void);
 
 #ifdef __cplusplus
 }

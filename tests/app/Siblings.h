@@ -8,7 +8,9 @@
 
 #include <QByteArray>
 #include <QList>
+#include <memory>
 #include <mutex>
+#include <unistd.h>
 
 struct SiblingCall {
     long service = 0;
@@ -19,13 +21,23 @@ struct SiblingCall {
 class Siblings
 {
 public:
-    bool listen()
+    // Sets the port offset of this process to one whose ports are free.
+    bool listenOnFreePorts()
     {
-        if (!mMain.initialize(1000) || !mSubPanel.initialize(1002))
-            return false;
-        mMain.addReceiver(new Recorder(1, *this));
-        mSubPanel.addReceiver(new Recorder(3, *this));
-        return true;
+        for (int i = 0; i < OFFSETS_TRIED; ++i) {
+            const int offset = FIRST_OFFSET + OFFSET_STEP * ((::getpid() + i) % OFFSETS);
+            qputenv("K2SYS_PORT_OFFSET", QByteArray::number(offset));
+            auto main = std::make_unique<SocketRemoteReceiver>(0);
+            auto subPanel = std::make_unique<SocketRemoteReceiver>(0);
+            if (!main->initialize(1000) || !subPanel->initialize(1002))
+                continue;
+            main->addReceiver(new Recorder(1, *this));
+            subPanel->addReceiver(new Recorder(3, *this));
+            mMain = std::move(main);
+            mSubPanel = std::move(subPanel);
+            return true;
+        }
+        return false;
     }
 
     // The method ids called of the service, in their order.
@@ -58,6 +70,11 @@ public:
     }
 
 private:
+    static constexpr int FIRST_OFFSET = 10000; // below the ports that the system gives to clients
+    static constexpr int OFFSET_STEP = 10;
+    static constexpr int OFFSETS = 1900;
+    static constexpr int OFFSETS_TRIED = 20;
+
     class Recorder : public PTC::Receiver
     {
     public:
@@ -80,6 +97,6 @@ private:
 
     mutable std::mutex mMutex;
     QList<SiblingCall> mCalls;
-    SocketRemoteReceiver mMain{0};
-    SocketRemoteReceiver mSubPanel{0};
+    std::unique_ptr<SocketRemoteReceiver> mMain;
+    std::unique_ptr<SocketRemoteReceiver> mSubPanel;
 };

@@ -14,12 +14,16 @@
 #include "document/Archive.h"
 #include "document/ArchiveController.h"
 #include "document/ArchiveOrder.h"
+#include "document/TText.h"
+#include "document/TextStyle.h"
 #include "document/TitleParser.h"
 #include "library/ArchiveList.h"
 #include "touchui/KSInputContext.h"
 #include "touchui/KSPushbutton.h"
 
+#include <QAction>
 #include <QApplication>
+#include <QDir>
 #include <QLabel>
 #include <QSignalSpy>
 #include <QTemporaryDir>
@@ -65,7 +69,7 @@ private:
 
 void tst_titler_window::initTestCase()
 {
-    QVERIFY(mSiblings.listen());
+    QVERIFY(mSiblings.listenOnFreePorts());
     APPEventFilter::instance();
     Q_INIT_RESOURCE(UILibrary);
     mWindow = new TitlerWindow(true, nullptr);
@@ -257,7 +261,11 @@ void tst_titler_window::focusCommandLeavesACleanStackClean()
     struct Focus : QUndoCommand {
         int id() const override { return 1; }
     };
-    auto* undo = mWindow->findChild<QAction*>();
+    QAction* undo = nullptr;
+    for (QAction* action : mWindow->findChildren<QAction*>(QString(), Qt::FindDirectChildrenOnly)) {
+        if (action->text().startsWith("Undo"))
+            undo = action;
+    }
     QVERIFY(undo);
     mWindow->pushUndoStack(new Focus);
     QVERIFY(!undo->isEnabled());
@@ -345,7 +353,6 @@ void tst_titler_window::languageFallsBackToEnglish()
 
 int main(int argc, char** argv)
 {
-    qputenv("K2SYS_PORT_OFFSET", "21000");
     KSInputContext::install();
     QApplication application(argc, argv);
     application.setObjectName("Titler");

@@ -25,6 +25,7 @@ SLOW = 4 if os.path.basename(BUILD).endswith("asan") else 1
 
 # Where things are in the window, in its own pixels.
 CANVAS = (609, 97, 1280, 720)
+TOP_WINDOW_MAIN = 2
 LIST_POINT = (380, 130)
 LIST_ROW = 143
 PICTURES = {"_1920.png": (1920, 1080), "_960.png": (960, 540), "_240.png": (240, 135), "_240S.png": (240, 135)}
@@ -103,6 +104,7 @@ class TitlerTest(unittest.TestCase):
                                            self.titler_arguments)
         self.addCleanup(self.titler.stop)
         session.wait_listening(self.titler, session.TITLER_PORT + OFFSET, 60 * SLOW)
+        self.command("wait-titler")
 
     def tearDown(self):
         outcome = self._outcome.result
@@ -111,6 +113,14 @@ class TitlerTest(unittest.TestCase):
             shutil.rmtree(self.keep, ignore_errors=True)
         elif self.display:
             self.display.screenshot(os.path.join(self.keep, "failed.png"))
+
+    def command(self, line):
+        """Gives the appliance a command and waits until it has been carried out."""
+        start = self.appliance.mark()
+        self.appliance.command(line)
+        done = self.appliance.wait_for(lambda event: event.get("command") == line and event["event"] != "call",
+                                       30 * SLOW, start, f"an answer to {line}")
+        self.assertEqual(done["event"], "ok", done)
 
     # Data
 
@@ -162,8 +172,16 @@ class TitlerTest(unittest.TestCase):
         self.click(*TOOL_POINTS[name])
 
     def close_window(self):
+        start = self.appliance.mark()
         self.click_tool("Close")
+        self.wait_closed(start)
+
+    def wait_closed(self, start):
+        """Waits until the window is gone and the last call of a session has come: all others are here with it."""
         self.wait_hidden()
+        self.appliance.wait_for(
+            lambda event: event.get("method") == "setTopWindow" and event["args"]["topWindow"] == TOP_WINDOW_MAIN,
+            20 * SLOW, start, "the end of the session")
 
     def choose_in_list_menu(self, row, entry):
         """Opens the option menu of the title in this row by a right click and chooses an entry by keys."""
@@ -179,9 +197,25 @@ class TitlerTest(unittest.TestCase):
     def wait_titles(self, folder, count, timeout=20):
         session.wait_until(lambda: len(self.titles(folder)) == count, timeout * SLOW, f"{count} titles in {folder}")
 
-    def wait_keyboard(self, start, timeout=20):
+    def calls(self, service, method, start=0):
+        """The arguments of the titler's calls of a service's method since start."""
+        return [event["args"] for event in self.appliance.since(start)
+                if (event.get("event"), event.get("service"), event.get("method")) == ("call", service, method)]
+
+    def wait_call(self, service, method, start, timeout=20):
+        """Waits for such a call and gives its arguments."""
+        return self.appliance.wait_event("call", timeout * SLOW, start, service=service, method=method)["args"]
+
+    def wait_keyboard(self, start):
         """Waits until the titler has asked for the soft keyboard."""
-        self.appliance.wait_event("keyboard-show", timeout * SLOW, start)
+        self.wait_call("SoftKeyBoardController", "show", start)
+
+    def posted_messages(self, start):
+        return [call["messageId"] for call in self.calls("MessageCenter", "postMessage", start)]
+
+    def results(self, start):
+        """The results of create requests that the titler has sent back since start."""
+        return [event for event in self.appliance.since(start) if event.get("event") == "callback"]
 
     def type_keys(self, text):
         self.display.xdotool("type", "--clearmodifiers", "--delay", "40", text)
@@ -192,7 +226,7 @@ class TitlerTest(unittest.TestCase):
         return path
 
     def open_title(self, title):
-        self.appliance.command(f"edit {title.path}")
+        self.command(f'edit "{title.path}"')
         return self.wait_shown()
 
     def assert_canvas_shows(self, title, mean, visible):

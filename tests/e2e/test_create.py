@@ -13,7 +13,8 @@ class CreateTitles(harness.TitlerTest):
         """Asks for new titles; the folder that was open last stands for the operator's choice."""
         self.open_title(self.titles(folder)[0])
         self.close_window()
-        self.appliance.command(f"create {CALL_TYPE}")
+        self.command("register")
+        self.command(f"create {CALL_TYPE}")
         self.wait_shown()
 
     def test_new_titles_come_back_in_the_order_of_the_folder(self):
@@ -28,13 +29,13 @@ class CreateTitles(harness.TitlerTest):
             self.wait_titles(folder, count + 1)
         self.close_window()
 
-        result = self.appliance.wait_event("result", start=start)
+        result = self.wait_result(start)
         new = [title.path for title in self.titles(folder) if title.path not in old]
         self.assertEqual(len(new), 2)
         self.assertGreater(new[0], new[1], "the names tell the time of making")
         self.assertEqual(result["type"], CALL_TYPE)
         self.assertEqual(result["path"], folder)
-        self.assertEqual(result["files"], new)
+        self.assertEqual(result["paths"], new)
         self.assertEqual(result["count"], 2)
         self.assertEqual(result["size"], sum(self.packed_size(path) for path in new))
         for path in new:
@@ -47,9 +48,9 @@ class CreateTitles(harness.TitlerTest):
         self.open_for_creation(folder)
         start = self.appliance.mark()
         self.close_window()
-        result = self.appliance.wait_event("result", start=start)
+        result = self.wait_result(start)
         self.assertEqual((result["type"], result["path"]), (CALL_TYPE, folder))
-        self.assertEqual((result["count"], result["size"], result["files"]), (0, 0, []))
+        self.assertEqual((result["count"], result["size"], result["paths"]), (0, 0, []))
 
     def test_a_title_that_was_deleted_again_is_not_named(self):
         folder = self.folder(FOLDER)
@@ -61,9 +62,14 @@ class CreateTitles(harness.TitlerTest):
         self.choose_in_list_menu(2, "Delete")
         self.wait_titles(folder, 2)
         self.close_window()
-        result = self.appliance.wait_event("result", start=start)
-        self.assertEqual(result["files"], [])
+        result = self.wait_result(start)
+        self.assertEqual(result["paths"], [])
         self.assertEqual([title.path for title in self.titles(folder)], old)
+
+    def wait_result(self, start):
+        result = self.appliance.wait_event("callback", 20 * harness.SLOW, start)
+        self.assertEqual(result["method"], "finishTitlerCreateCallback")
+        return result
 
     @staticmethod
     def packed_size(path):

@@ -17,21 +17,22 @@ class ClosingQuestion(harness.TitlerTest):
 
         start = self.appliance.mark()
         self.click_tool("Close")
-        self.appliance.wait_event("message", start=start, id=CONFIRM_CLOSE)
+        message = self.wait_call("MessageCenter", "postMessage", start)
+        self.assertEqual(message["messageId"], CONFIRM_CLOSE)
         self.assertTrue(self.stays_shown())
         # The answer to another question is not the answer to this one.
-        self.appliance.command(f"message-close 110 {ANSWER_OK}")
+        self.command(f"message-close 110 {ANSWER_OK}")
         self.assertTrue(self.stays_shown())
-        self.appliance.command(f"message-close {CONFIRM_CLOSE} {ANSWER_OK}")
-        self.wait_hidden()
+        self.command(f"message-close {CONFIRM_CLOSE} {ANSWER_OK}")
+        self.wait_closed(start)
         self.assertEqual(len(self.titles(folder)), 5)
-        self.assertIsNone(self.appliance.find(start, lambda event: event.get("event") == "result"))
+        self.assertEqual(self.results(start), [])
 
         # The question was for that session only.
         self.open_title(self.titles(folder)[0])
         start = self.appliance.mark()
         self.close_window()
-        self.assertIsNone(self.appliance.find(start, lambda event: event.get("event") == "message"))
+        self.assertEqual(self.posted_messages(start), [])
 
 
 class Requests(harness.TitlerTest):
@@ -39,16 +40,16 @@ class Requests(harness.TitlerTest):
         first, second = self.titles(self.folder())[:2]
         self.open_title(first)
         before = self.display.grab()
-        self.appliance.command(f"edit {second.path}")
+        self.command(f'edit "{second.path}"')
         # A later call on the same connection is handled after the dropped one.
-        self.appliance.command("dialog-mask on")
+        self.command("dialog-mask 1")
         harness.session.wait_until(lambda: self.display.grab() != before, 20 * harness.SLOW, "the mask")
-        self.appliance.command("dialog-mask off")
+        self.command("dialog-mask 0")
         harness.session.wait_until(lambda: self.display.grab() == before, 20 * harness.SLOW, "the first title again")
         self.assert_canvas_shows(first, mean=1.5, visible=0.01)
 
     def test_a_path_that_does_not_exist_shows_nothing(self):
-        self.appliance.command(f"edit {self.folder('gone')}/gone.xml")
+        self.command(f'edit "{self.folder("gone")}/gone.xml"')
         first = self.titles(self.folder())[0]
         self.open_title(first)
         self.assert_canvas_shows(first, mean=1.5, visible=0.01)
@@ -57,17 +58,19 @@ class Requests(harness.TitlerTest):
         self.open_title(self.titles(self.folder())[0])
         self.close_window()
         start = self.appliance.mark()
-        self.appliance.command("sub")
+        self.command("register")
+        self.command("sub")
         self.wait_shown()
         self.close_window()
-        self.assertIsNone(self.appliance.find(start, lambda event: event.get("event") in ("result", "message")))
+        self.assertEqual(self.results(start), [])
+        self.assertEqual(self.posted_messages(start), [])
 
 
 class RightScreen(harness.TitlerTest):
     titler_arguments = ("-right",)
 
     def test_the_window_lies_to_the_right(self):
-        self.appliance.command(f"edit {self.titles(self.folder())[0].path}")
+        self.command(f'edit "{self.titles(self.folder())[0].path}"')
         self.wait_shown()
         self.assertEqual(self.display.geometry(self.window()), (1280, 0, 1920, 1080))
 

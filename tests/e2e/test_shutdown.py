@@ -25,12 +25,12 @@ class Shutdown(harness.TitlerTest):
         self.assert_no_leftovers(self.folder())
 
     def test_power_off_ends_an_idle_titler(self):
-        self.appliance.command("power-off")
+        self.command("power-off")
         self.assertEqual(self.titler.wait(20 * harness.SLOW), 0)
 
     def test_power_off_saves_first(self):
         title = self.type_a_text()
-        self.appliance.command("power-off")
+        self.command("power-off")
         self.assertEqual(self.titler.wait(30 * harness.SLOW), 0)
         self.assert_whole(title)
 

@@ -1,0 +1,1211 @@
+#include "CanvasTestTools.h"
+
+#include "canvas/CanvasScene.h"
+#include "canvas/GraphicsPixmap.h"
+#include "canvas/GraphicsView.h"
+#include "canvas/ICanvasHost.h"
+#include "canvas/IInputLanguageSource.h"
+#include "canvas/MessageBoxController.h"
+#include "canvas/TextPainter.h"
+#include "document/Archive.h"
+#include "document/TitleParser.h"
+#include "touchui/KSSoftKeyboardCursorSettingEvent.h"
+
+#include <QAction>
+#include <QFileInfo>
+#include <QGraphicsRectItem>
+#include <QPen>
+#include <QSignalSpy>
+#include <QTemporaryDir>
+#include <QTest>
+#include <QTextBlock>
+#include <QTextLayout>
+#include <QUndoStack>
+#include <cmath>
+
+namespace
+{
+
+class FakeMessages : public MessageBoxController
+{
+public:
+    void setFactory(TitlerToolFactory*) override {}
+    void postMessage(MessageDef::Message_ID id) override { posted.append({int(id), QString()}); }
+    void postMessage(MessageDef::Message_ID id, QString text) override { posted.append({int(id), text}); }
+    void postMessage(MessageDef::Message_ID id, MessageDefine::_emBoxType, QString text) override
+    {
+        posted.append({int(id), text});
+    }
+    void setMessageMainWindow(QWidget*) override {}
+    bool GetTitlerIsTop() override { return true; }
+    QMap<QString, QString> getMapData() override { return {}; }
+    void closeMessage(MessageDefine::_emCloseType) override {}
+
+    QList<QPair<int, QString>> posted;
+};
+
+FakeMessages* messages = nullptr;
+
+class FakeHost : public ICanvasHost
+{
+public:
+    bool windowIsVisible() const override { return visible; }
+    bool visible = false;
+};
+
+struct RenderLog {
+    int fast = 0;
+    int slow = 0;
+    bool finished = true;
+    IThumbnailRender* render = nullptr;
+};
+
+class FakeRender : public IThumbnailRender
+{
+public:
+    explicit FakeRender(RenderLog& log) : m_log(log) { m_log.render = this; }
+    void makeThumbnail(const Archive* archive, bool bigSize) override
+    {
+        if (archive)
+            ++(bigSize ? m_log.slow : m_log.fast);
+    }
+    bool makePictureThreadIsFinished() override { return m_log.finished; }
+
+private:
+    RenderLog& m_log;
+};
+
+// A canvas on its view with an undo stack, as the window has it.
+class Canvas
+{
+public:
+    Canvas() : scene(std::make_unique<CanvasScene>(std::make_unique<FakeRender>(log))), view(scene.get())
+    {
+        scene->setSceneRect(GraphicsText::SCENE_RECT);
+        view.setFrameStyle(0);
+        view.setHorizontalScrollBarPolicy(Qt::ScrollBarAlwaysOff);
+        view.setVerticalScrollBarPolicy(Qt::ScrollBarAlwaysOff);
+        view.resize(1280, 720);
+        QObject::connect(scene.get(), &CanvasScene::signalPushUndoCommandIntoStack, &stack,
+                         [this](QUndoCommand* command) { stack.push(command); });
+        title.setPath((folder.path() + "/title.xml").toStdString());
+    }
+    void show()
+    {
+        view.show();
+        QVERIFY(QTest::qWaitForWindowActive(&view));
+    }
+    void open(const QList<TText>& texts)
+    {
+        title.releaseVectorText();
+        std::vector<TText*> records;
+        for (const TText& text : texts)
+            records.push_back(new TText(text));
+        title.setText(records);
+        scene->slotUpdateArchive(&title);
+    }
+    GraphicsText* text(int id) const { return scene->findTextItem(id); }
+    // A point on the first character of the object, in view coordinates.
+    QPoint pointOn(int id) const
+    {
+        const GraphicsText* item = text(id);
+        return view.mapFromScene(item->scenePos() + item->layoutRect().center());
+    }
+    void tap(QPoint point) { QTest::mouseClick(view.viewport(), Qt::LeftButton, {}, point); }
+    void drag(QPoint from, QPoint to)
+    {
+        QTest::mousePress(view.viewport(), Qt::LeftButton, {}, from);
+        QTest::mouseMove(view.viewport(), from + (to - from) / 2);
+        sendMove(from + (to - from) / 2);
+        sendMove(to);
+        QTest::mouseRelease(view.viewport(), Qt::LeftButton, {}, to);
+    }
+    void sendMove(QPoint point)
+    {
+        QMouseEvent move(QEvent::MouseMove, point, view.viewport()->mapToGlobal(point), Qt::NoButton,
+                         Qt::LeftButton, {});
+        QCoreApplication::sendEvent(view.viewport(), &move);
+    }
+    // What lies in the file now.
+    std::unique_ptr<Archive> saved() const
+    {
+        auto archive = std::make_unique<Archive>();
+        return TitleParser().readOneTitle(title.getPath(), archive.get()) == 1 ? std::move(archive) : nullptr;
+    }
+
+    QTemporaryDir folder;
+    Archive title;
+    RenderLog log;
+    QUndoStack stack;
+    std::unique_ptr<CanvasScene> scene;
+    GraphicsView view;
+};
+
+const QPoint EmptyPlace(1200, 680);
+
+} // namespace
+
+// The canvas: titles, objects, style changes, undo, touch and keyboard.
+class tst_canvasscene : public QObject
+{
+    Q_OBJECT
+
+private slots:
+    void initTestCase();
+    void init();
+    void cleanup();
+
+    void showsATitle();
+    void nullTitleEmptiesTheCanvas();
+    void titleWithoutTexts();
+    void missingFontWhileHidden();
+    void missingFontWhileVisible();
+    void missingFontWithoutMessages();
+
+    void newText();
+    void newObjectsCascade();
+    void lowestIdIsReused();
+    void fifthObjectIsRefused();
+    void newObjectTakesThePanelsStyle();
+    void languageChangeChoosesTheFamily();
+    void chinaModel();
+
+    void modeTable_data();
+    void modeTable();
+    void styleOfSelectedObject();
+    void styleOfSelectedCharacters();
+    void styleForNextCharacter();
+    void styleWithoutActiveObject();
+
+    void typingByKeys();
+    void createTypeUndoRedo();
+    void undoOfEditLeavesObjectSelected();
+    void deleteAndUndo();
+    void moveAndUndo();
+    void undoWithoutObject();
+
+    void tapSelectsThenEdits();
+    void secondTapPlacesTheCursor();
+    void dragMovesASelectedObject();
+    void dragStopsAtTheLimit();
+    void rightButtonDoesNothing();
+    void releaseOnEmptyCanvas();
+    void emptyObjectGoesAtTheNextRelease();
+    void emptyObjectUnderTheFingerStays();
+    void doubleTapSelectsAll();
+    void longPressSelectsACharacter();
+    void handleIsGrabbedBesideItsPicture();
+
+    void keyboardClosedOnText();
+    void keyboardClosedOnEmptiedObject();
+    void keyboardCursor_data();
+    void keyboardCursor();
+    void dataInfo();
+    void keyboardRequestNamesTheItem();
+
+    void deleteSelectedLeavesEmptyOnes();
+    void savesAtOnce();
+    void picturesFollowTheTitle();
+    void withoutRender();
+    void backgroundBrush();
+    void safeArea();
+    void generateThumbnail();
+    void switchingTitlesFinishesEditing();
+};
+
+void tst_canvasscene::initTestCase()
+{
+    qRegisterMetaType<TText*>("TText*");
+    MessageBoxController::setProvider([]() -> MessageBoxController* { return messages; }, []() {});
+}
+
+void tst_canvasscene::init()
+{
+    messages = new FakeMessages;
+    InputLanguageFonts::resetLastFonts();
+    InputLanguageFonts::mInputLanguage = 2;
+    InputLanguageFonts::IS_CN_MODULE = false;
+}
+
+void tst_canvasscene::cleanup()
+{
+    delete messages;
+    messages = nullptr;
+    ICanvasHost::setInstance(nullptr);
+}
+
+void tst_canvasscene::showsATitle()
+{
+    Canvas canvas;
+    QImage background(1280, 720, QImage::Format_RGB32);
+    background.fill(Qt::blue);
+    const QString path = canvas.folder.path() + "/bg.png";
+    QVERIFY(background.save(path));
+    canvas.title.setBgResource("bg.png");
+    canvas.title.setBgPointX(3.0F);
+    canvas.title.setBgPointZ(-2.0F);
+    QSignalSpy button(canvas.scene.get(), &CanvasScene::signalDisableNewTextButton);
+    TText second = makeRecord("two", 2);
+    second.setZValue(7.0F);
+    canvas.open({makeRecord("one", 1), second});
+
+    QCOMPARE(button.last(), QVariantList({false}));
+    QCOMPARE(canvas.scene->getTextItemList().size(), 2);
+    QCOMPARE(canvas.text(1)->toPlainText(), QStringLiteral("one"));
+    QCOMPARE(canvas.text(2)->zValue(), 7.0);
+    QCOMPARE(canvas.text(2)->parentTextItem()->zValue(), 7.0);
+    QCOMPARE(canvas.text(1)->parentTextItem()->pos(), QPointF(300.0, 200.0));
+    QCOMPARE(canvas.text(1)->pos(), QPointF());
+    int pictures = 0;
+    const auto items = canvas.scene->items();
+    for (QGraphicsItem* item : items) {
+        if (item->type() != 65556)
+            continue;
+        ++pictures;
+        QCOMPARE(item->pos(), QPointF(3.0, 0.0));
+        QCOMPARE(item->zValue(), -2.0);
+        QCOMPARE(static_cast<GraphicsPixmap*>(item)->getPixmapPath(), path);
+        QVERIFY(!(item->flags() & QGraphicsItem::ItemIsMovable));
+    }
+    QCOMPARE(pictures, 1);
+    // The canvas holds a copy.
+    canvas.title.releaseVectorText();
+    QCOMPARE(canvas.scene->archive()->getText().size(), size_t(2));
+    QCOMPARE(canvas.text(1)->toPlainText(), QStringLiteral("one"));
+}
+
+void tst_canvasscene::nullTitleEmptiesTheCanvas()
+{
+    Canvas canvas;
+    canvas.open({makeRecord("one")});
+    canvas.scene->slotDrawSafeArea(true);
+    canvas.scene->saveArchive();
+    QSignalSpy button(canvas.scene.get(), &CanvasScene::signalDisableNewTextButton);
+    canvas.scene->slotUpdateArchive(nullptr);
+    QCOMPARE(button.last(), QVariantList({true}));
+    QCOMPARE(canvas.scene->getTextItemList().size(), 0);
+    QCOMPARE(canvas.scene->items().size(), 4);
+    // The title that was shown before stays as it is.
+    canvas.scene->saveArchive();
+    QCOMPARE(canvas.saved()->getText().size(), size_t(1));
+}
+
+void tst_canvasscene::titleWithoutTexts()
+{
+    Canvas canvas;
+    canvas.open({});
+    QCOMPARE(canvas.scene->items().size(), 0);
+    QVERIFY(!canvas.scene->itemIsEditorInteraction());
+    QVERIFY(!canvas.scene->itemIsSelectionMode());
+    canvas.scene->saveArchive();
+    QVERIFY(!QFileInfo::exists(QString::fromStdString(canvas.title.getPath())));
+}
+
+void tst_canvasscene::missingFontWhileHidden()
+{
+    Canvas canvas;
+    FakeHost host;
+    ICanvasHost::setInstance(&host);
+    QSignalSpy later(canvas.scene.get(), &CanvasScene::signalHasMessageToShowInformation);
+    canvas.open({makeRecord("one", 1, "No Such Family")});
+    QCOMPARE(later.count(), 1);
+    QCOMPARE(later.at(0), QVariantList({true, QStringLiteral("No Such Family")}));
+    QVERIFY(messages->posted.isEmpty());
+    QVERIFY(!QFileInfo::exists(QString::fromStdString(canvas.title.getPath())));
+}
+
+void tst_canvasscene::missingFontWhileVisible()
+{
+    Canvas canvas;
+    FakeHost host;
+    host.visible = true;
+    ICanvasHost::setInstance(&host);
+    QSignalSpy later(canvas.scene.get(), &CanvasScene::signalHasMessageToShowInformation);
+    canvas.open({makeRecord("one", 1, "No Such Family")});
+    QCOMPARE(later.count(), 0);
+    QCOMPARE(messages->posted.size(), 1);
+    QCOMPARE(messages->posted.at(0).first, 109);
+    QCOMPARE(messages->posted.at(0).second, QStringLiteral("No Such Family"));
+    // The family that stands in is written back.
+    const auto saved = canvas.saved();
+    QVERIFY(saved);
+    QCOMPARE(saved->getText()[0]->getTextItems()[0]->getFontFamily(), std::string("KST"));
+    canvas.scene->slotMakeSceneThumnail();
+    QCOMPARE(canvas.log.slow, 1);
+}
+
+void tst_canvasscene::missingFontWithoutMessages()
+{
+    delete messages;
+    messages = nullptr;
+    Canvas canvas;
+    FakeHost host;
+    host.visible = true;
+    ICanvasHost::setInstance(&host);
+    canvas.open({makeRecord("one", 1, "No Such Family")});
+    QVERIFY(canvas.saved());
+}
+
+void tst_canvasscene::newText()
+{
+    Canvas canvas;
+    canvas.open({});
+    QSignalSpy begin(canvas.scene.get(), &CanvasScene::signalBeginNewTextItem);
+    QSignalSpy inserted(canvas.scene.get(), &CanvasScene::signalTextInserted);
+    QSignalSpy start(canvas.scene.get(), &CanvasScene::signalStartEditTextItem);
+    QSignalSpy modes(canvas.scene.get(), &CanvasScene::signalSceneNotifyTextPropertyAreaObjectSelectionMode);
+    canvas.scene->slotInsertNewTextItem();
+    QCOMPARE(begin.count(), 1);
+    QCOMPARE(inserted.count(), 1);
+    QCOMPARE(start.count(), 1);
+    QCOMPARE(modes.last(), QVariantList({false, false}));
+    QCOMPARE(canvas.stack.count(), 1);
+    GraphicsText* item = canvas.text(1);
+    QVERIFY(item);
+    QCOMPARE(item->getFocusFlag(), 0);
+    QCOMPARE(item->textInteractionFlags(), Qt::TextEditorInteraction);
+    QCOMPARE(item->getStatusId(), 2);
+    QVERIFY(canvas.scene->itemIsEditorInteraction());
+    const QRectF area = item->parentTextItem()->layoutRect();
+    const QPointF center = canvas.scene->sceneRect().center();
+    QCOMPARE(item->scenePos(), center - QPointF(area.width() / 2.0, area.height() / 2.0));
+    QCOMPARE(item->getItemTText()->getXValue(), float(item->scenePos().x()));
+    QCOMPARE(item->getItemTText()->getZValue(), 1.0F);
+    QVERIFY(canvas.saved());
+}
+
+void tst_canvasscene::newObjectsCascade()
+{
+    Canvas canvas;
+    canvas.open({});
+    canvas.scene->slotDrawSafeArea(true);
+    canvas.scene->slotInsertNewTextItem();
+    typeText(*canvas.text(1), "ab");
+    const QPointF first = canvas.scene->sceneRect().center();
+    canvas.scene->slotInsertNewTextItem();
+    GraphicsText* second = canvas.text(2);
+    QVERIFY(second);
+    const QRectF area = second->parentTextItem()->layoutRect();
+    const QPointF offset = second->scenePos() + QPointF(area.width() / 2.0, area.height() / 2.0) - first;
+    QVERIFY(offset.x() > 0.0);
+    QCOMPARE(offset.x(), -offset.y());
+    QCOMPARE(std::fmod(offset.x(), 20.0), 0.0);
+    QCOMPARE(second->getItemTText()->getZValue(), 2.0F);
+    // The lines of the safe area lie above all texts.
+    const auto items = canvas.scene->items();
+    for (QGraphicsItem* item : items) {
+        if (item->type() == QGraphicsRectItem::Type)
+            QCOMPARE(item->zValue(), 6.0);
+    }
+}
+
+void tst_canvasscene::lowestIdIsReused()
+{
+    Canvas canvas;
+    canvas.open({makeRecord("1", 1), makeRecord("2", 2), makeRecord("3", 3), makeRecord("4", 4)});
+    canvas.text(2)->changeItemToSolidLineState();
+    canvas.scene->deleteSelectedItems();
+    QCOMPARE(canvas.text(2), nullptr);
+    QCOMPARE(canvas.scene->getTextItemList().size(), 3);
+    canvas.scene->slotInsertNewTextItem();
+    QVERIFY(canvas.text(2));
+    QCOMPARE(canvas.text(2)->toPlainText(), QString());
+}
+
+void tst_canvasscene::fifthObjectIsRefused()
+{
+    Canvas canvas;
+    canvas.open({makeRecord("1", 1), makeRecord("2", 2), makeRecord("3", 3), makeRecord("4", 4)});
+    QSignalSpy failed(canvas.scene.get(), &CanvasScene::signalNewTextInsertedFailed);
+    QSignalSpy inserted(canvas.scene.get(), &CanvasScene::signalTextInserted);
+    canvas.scene->slotInsertNewTextItem();
+    QCOMPARE(failed.count(), 1);
+    QCOMPARE(inserted.count(), 1);
+    QCOMPARE(messages->posted.size(), 1);
+    QCOMPARE(messages->posted.at(0).first, 110);
+    QCOMPARE(canvas.scene->getTextItemList().size(), 4);
+    QCOMPARE(canvas.stack.count(), 0);
+    QCOMPARE(canvas.scene->initCGraphicsTextItem(), -1);
+}
+
+void tst_canvasscene::newObjectTakesThePanelsStyle()
+{
+    Canvas canvas;
+    canvas.open({});
+    connect(canvas.scene.get(), &CanvasScene::signalBeginNewTextItem, canvas.scene.get(), [&canvas] {
+        TText property = makeSource(makeStyle(""), 1);
+        property.setTextAlign(1);
+        property.setShadowStyle(1);
+        property.getTextShadow()->setShadowDirectionX(4);
+        canvas.scene->slotUpdateCurrentTextProperty(property);
+    });
+    TText sent = makeSource(makeStyle("", "DejaVu Sans", 44), 3);
+    canvas.scene->slotChangeObjectTextStyle(&sent, 1, 1);
+    canvas.scene->slotInsertNewTextItem();
+    GraphicsText* item = canvas.text(1);
+    QCOMPARE(item->getItemTText()->getTextAlign(), 1);
+    QCOMPARE(item->getItemTText()->getShadowStyle(), 1);
+    typeText(*item, "a");
+    QCOMPARE(item->getItemTText()->textItems()[0]->getFontSize(), 44);
+    QCOMPARE(item->getItemTText()->textItems()[0]->getFontFamily(), std::string("DejaVu Sans"));
+    QCOMPARE(item->getItemTText()->getShadowStyle(), 1);
+}
+
+void tst_canvasscene::languageChangeChoosesTheFamily()
+{
+    Canvas canvas;
+    canvas.open({});
+    canvas.scene->slotSceneInputLanguageChanged(SystemSetupDef::emInputLanguageKorean);
+    canvas.scene->slotInsertNewTextItem();
+    QCOMPARE(canvas.text(1)->getLastAlpaTextStyleValue()->textItems()[0]->getFontFamily(),
+             std::string("YDGothic 100 Pro"));
+    QCOMPARE(InputLanguageFonts::mInputLanguage, 3);
+    typeText(*canvas.text(1), "a");
+    QCOMPARE(canvas.text(1)->getItemTText()->textItems()[0]->getFontFamily(), std::string("KST"));
+    // Only the first object after the change.
+    canvas.scene->slotInsertNewTextItem();
+    QCOMPARE(canvas.text(2)->getLastAlpaTextStyleValue()->textItems()[0]->getFontFamily(),
+             std::string("KST"));
+
+    IInputLanguageSource source;
+    IInputLanguageSource::setInstance(&source);
+    GraphicsText listener(nullptr, 0, nullptr, nullptr);
+    Q_EMIT source.signalsInputLanguageInfo(SystemSetupDef::emInputLanguageChineseSimplified);
+    QCOMPARE(InputLanguageFonts::mInputLanguage, 0);
+    IInputLanguageSource::setInstance(nullptr);
+}
+
+void tst_canvasscene::chinaModel()
+{
+    Canvas canvas;
+    canvas.scene->setModuleInfo(SystemSetupDef::emInformationModelChina);
+    QVERIFY(GraphicsText::IS_CN_MODULE);
+    for (const auto& row : GraphicsText::LAST_KEEPED_FONT) {
+        for (const QString& family : row)
+            QCOMPARE(family, QStringLiteral("DFHeiW5-A"));
+    }
+    canvas.open({});
+    canvas.scene->slotInsertNewTextItem();
+    QCOMPARE(canvas.text(1)->getLastAlpaTextStyleValue()->textItems()[0]->getFontFamily(),
+             std::string("DFHeiW5-A"));
+    // A family chosen in the panel counts again.
+    TText sent = makeSource(makeStyle("", "DejaVu Sans"), 1);
+    canvas.scene->slotChangeObjectTextStyle(&sent, 0, 1);
+    canvas.scene->slotInsertNewTextItem();
+    QCOMPARE(
+        canvas.scene->getTextItemList().last()->getLastAlpaTextStyleValue()->textItems()[0]->getFontFamily(),
+        std::string("DejaVu Sans"));
+    canvas.scene->setModuleInfo(SystemSetupDef::emInformationModelDefault);
+    QVERIFY(!GraphicsText::IS_CN_MODULE);
+    QVERIFY(GraphicsText::LAST_KEEPED_FONT == GraphicsText::LANGUAGE_DEFAULT_FONT);
+}
+
+void tst_canvasscene::modeTable_data()
+{
+    QTest::addColumn<int>("status");
+    QTest::addColumn<bool>("overall");
+    QTest::addColumn<bool>("same");
+    QTest::addColumn<int>("mode");
+    for (const bool overall : {false, true}) {
+        for (const bool same : {false, true}) {
+            QTest::addRow("object %d %d", overall, same) << 0 << overall << same << 0;
+            QTest::addRow("selection %d %d", overall, same) << 1 << overall << same << (overall ? 2 : 3);
+            QTest::addRow("none %d %d", overall, same) << -1 << overall << same << -1;
+        }
+    }
+    QTest::newRow("caret overall") << 2 << true << true << 1;
+    QTest::newRow("caret part") << 2 << false << true << 4;
+    QTest::newRow("caret mixed overall") << 2 << true << false << -1;
+    QTest::newRow("caret mixed part") << 2 << false << false << -1;
+}
+
+void tst_canvasscene::modeTable()
+{
+    QFETCH(int, status);
+    QFETCH(bool, overall);
+    QFETCH(bool, same);
+    QFETCH(int, mode);
+    QCOMPARE(CanvasScene::getItemTextEditId(status, overall, same), mode);
+}
+
+void tst_canvasscene::styleOfSelectedObject()
+{
+    Canvas canvas;
+    canvas.open({makeRecord("abc")});
+    canvas.text(1)->changeItemToSolidLineState();
+    QCOMPARE(canvas.text(1)->getStatusId(), 0);
+    TText sent = makeSource(makeStyle("", "KST", 40), 3);
+    canvas.scene->slotChangeObjectTextStyle(&sent, 1, 1);
+    QCOMPARE(canvas.text(1)->getItemTText()->textItems()[2]->getFontSize(), 40);
+    QCOMPARE(canvas.stack.count(), 1);
+    QCOMPARE(canvas.text(1)->getStatusId(), 0);
+    sent.setXValue(301.0F);
+    sent.setYValue(201.0F);
+    canvas.scene->slotChangeObjectTextStyle(&sent, 11, 1);
+    QCOMPARE(canvas.text(1)->scenePos(), QPointF(301.0, 201.0));
+    QCOMPARE(canvas.stack.count(), 2);
+    canvas.stack.undo();
+    QCOMPARE(canvas.text(1)->scenePos(), QPointF(300.0, 200.0));
+    canvas.stack.undo();
+    QCOMPARE(canvas.text(1)->getItemTText()->textItems()[2]->getFontSize(), 96);
+    canvas.stack.redo();
+    QCOMPARE(canvas.text(1)->getItemTText()->textItems()[2]->getFontSize(), 40);
+}
+
+void tst_canvasscene::styleOfSelectedCharacters()
+{
+    Canvas canvas;
+    canvas.open({makeRecord("abc")});
+    canvas.text(1)->initNewTextSelectAll();
+    selectRange(*canvas.text(1), 1, 3);
+    TText sent = makeSource(makeStyle("", "KST", 40), 2);
+    canvas.scene->slotChangeObjectTextStyle(&sent, 1, 1);
+    QCOMPARE(canvas.text(1)->getItemTText()->textItems()[0]->getFontSize(), 96);
+    QCOMPARE(canvas.text(1)->getItemTText()->textItems()[1]->getFontSize(), 40);
+    QCOMPARE(canvas.text(1)->textCursor().selectionStart(), 1);
+    // A property of the object ends editing.
+    sent.setTextAlign(1);
+    canvas.scene->slotChangeObjectTextStyle(&sent, 9, 1);
+    QCOMPARE(canvas.text(1)->getItemTText()->getTextAlign(), 1);
+    QCOMPARE(canvas.text(1)->getStatusId(), 0);
+}
+
+void tst_canvasscene::styleForNextCharacter()
+{
+    Canvas canvas;
+    canvas.open({makeRecord("abc")});
+    GraphicsText* item = canvas.text(1);
+    item->initNewTextSelectAll();
+    TText sent = makeSource(makeStyle("", "KST", 40), 1);
+    canvas.scene->slotChangeObjectTextStyle(&sent, 1, 1);
+    QCOMPARE(canvas.stack.count(), 0);
+    QCOMPARE(item->getStatusId(), 2);
+    typeText(*item, "x");
+    const int at = item->textCursor().position() - 1;
+    QCOMPARE(item->getItemTText()->textItems()[size_t(at)]->getFontSize(), 40);
+}
+
+void tst_canvasscene::styleWithoutActiveObject()
+{
+    Canvas canvas;
+    canvas.open({makeRecord("abc")});
+    TText sent = makeSource(makeStyle("", "KST", 40), 3);
+    canvas.scene->slotChangeObjectTextStyle(&sent, 1, 1);
+    QCOMPARE(canvas.text(1)->getItemTText()->textItems()[0]->getFontSize(), 96);
+    canvas.scene->slotChangeObjectTextStyle(nullptr, 1, 1);
+    TText empty;
+    canvas.scene->slotChangeObjectTextStyle(&empty, 1, 1);
+    QCOMPARE(canvas.stack.count(), 0);
+}
+
+void tst_canvasscene::typingByKeys()
+{
+    Canvas canvas;
+    canvas.show();
+    canvas.open({});
+    canvas.scene->slotInsertNewTextItem();
+    QTest::keyClicks(canvas.view.viewport(), "Breaking ");
+    QTest::keyClick(canvas.view.viewport(), Qt::Key_Return);
+    for (const QChar c : QString::fromUtf8("速報é"))
+        QTest::sendKeyEvent(QTest::Click, canvas.view.viewport(), Qt::Key_unknown, QString(c),
+                            Qt::NoModifier);
+    GraphicsText* item = canvas.text(1);
+    QCOMPARE(item->toPlainText(), QString::fromUtf8("Breaking \n速報é"));
+    QVERIFY(inStep(*item));
+    QTest::keyClick(canvas.view.viewport(), Qt::Key_Backspace);
+    QTest::keyClick(canvas.view.viewport(), Qt::Key_Home, Qt::ControlModifier);
+    QTest::keyClick(canvas.view.viewport(), Qt::Key_Delete);
+    QCOMPARE(item->toPlainText(), QString::fromUtf8("reaking \n速報"));
+    QVERIFY(inStep(*item));
+    // The document has no undo of its own.
+    QTest::keyClick(canvas.view.viewport(), Qt::Key_Z, Qt::ControlModifier);
+    QCOMPARE(item->toPlainText(), QString::fromUtf8("reaking \n速報"));
+    // Keys find the object although the scene lost the focus.
+    canvas.scene->setFocusItem(nullptr);
+    QTest::keyClick(canvas.view.viewport(), Qt::Key_B);
+    QCOMPARE(item->toPlainText(), QString::fromUtf8("breaking \n速報"));
+}
+
+void tst_canvasscene::createTypeUndoRedo()
+{
+    Canvas canvas;
+    canvas.open({});
+    canvas.scene->slotInsertNewTextItem();
+    TText style = makeSource(makeStyle("", "DejaVu Sans", 40), 1);
+    typeText(*canvas.text(1), "ab");
+    canvas.text(1)->saveStyleForNextInsert(&style, 1, 0);
+    typeText(*canvas.text(1), "c");
+    canvas.text(1)->pushLastEditTextIntoStack();
+    QCOMPARE(canvas.stack.count(), 2);
+    const std::unique_ptr<TText> typed(canvas.text(1)->getTextList());
+
+    canvas.stack.undo();
+    QCOMPARE(canvas.text(1)->toPlainText(), QString());
+    canvas.stack.undo();
+    QCOMPARE(canvas.text(1), nullptr);
+    QCOMPARE(canvas.scene->getTextItemList().size(), 0);
+    canvas.stack.redo();
+    QVERIFY(canvas.text(1));
+    QCOMPARE(canvas.text(1)->toPlainText(), QString());
+    canvas.stack.redo();
+    const std::unique_ptr<TText> again(canvas.text(1)->getTextList());
+    QCOMPARE(again->getText(), typed->getText());
+    QVERIFY(again->textItemsIsTheSame(*typed));
+    QCOMPARE(again->getTextObjectID(), 1);
+    canvas.stack.undo();
+    canvas.stack.undo();
+    QCOMPARE(canvas.text(1), nullptr);
+    canvas.stack.redo();
+    canvas.stack.redo();
+    QVERIFY(std::unique_ptr<TText>(canvas.text(1)->getTextList())->textItemsIsTheSame(*typed));
+    QCOMPARE(canvas.saved()->getText()[0]->getText(), std::string("abc"));
+}
+
+void tst_canvasscene::undoOfEditLeavesObjectSelected()
+{
+    Canvas canvas;
+    canvas.open({makeRecord("abc")});
+    canvas.text(1)->initNewTextSelectAll();
+    typeTextAt(*canvas.text(1), 3, "d");
+    canvas.text(1)->pushLastEditTextIntoStack();
+    canvas.stack.undo();
+    QCOMPARE(canvas.text(1)->toPlainText(), QStringLiteral("abc"));
+    QCOMPARE(canvas.text(1)->getStatusId(), 0);
+    QCOMPARE(canvas.text(1)->textInteractionFlags(), Qt::NoTextInteraction);
+    QCOMPARE(canvas.stack.command(0)->text(), QStringLiteral("edit undo"));
+    canvas.stack.redo();
+    QCOMPARE(canvas.text(1)->toPlainText(), QStringLiteral("abcd"));
+    QCOMPARE(canvas.stack.command(0)->text(), QStringLiteral("edit redo"));
+}
+
+void tst_canvasscene::deleteAndUndo()
+{
+    Canvas canvas;
+    canvas.open({makeRecord("abc"), makeRecord("other", 2)});
+    TText last = makeSource(makeStyle("", "KST", 31), 1);
+    canvas.text(1)->setLastAlpaTextStyleValue(last);
+    canvas.text(1)->changeItemToSolidLineState();
+    GraphicsText* gone = canvas.text(1);
+    canvas.scene->deleteSelectedItems();
+    QCOMPARE(canvas.text(1), nullptr);
+    QVERIFY(!gone->isEnabled());
+    QVERIFY(!gone->isVisible());
+    QVERIFY(!canvas.scene->enableItems().contains(gone));
+    QCOMPARE(canvas.saved()->getText().size(), size_t(1));
+    canvas.stack.undo();
+    QVERIFY(canvas.text(1));
+    QVERIFY(canvas.text(1) != gone);
+    QCOMPARE(canvas.text(1)->toPlainText(), QStringLiteral("abc"));
+    QCOMPARE(canvas.text(1)->getLastAlpaTextStyleValue()->textItems()[0]->getFontSize(), 31);
+    QCOMPARE(canvas.text(1)->getStatusId(), 0);
+    QCOMPARE(canvas.saved()->getText().size(), size_t(2));
+    canvas.stack.redo();
+    QCOMPARE(canvas.text(1), nullptr);
+    canvas.stack.undo();
+    QVERIFY(canvas.text(1));
+}
+
+void tst_canvasscene::moveAndUndo()
+{
+    Canvas canvas;
+    canvas.open({makeRecord("abc")});
+    canvas.scene->slotCreateMoveUndoCommand(1, QPointF(1.0, 2.0), QPointF(1.0, 2.0 + 1e-13));
+    QCOMPARE(canvas.stack.count(), 0);
+    canvas.scene->slotCreateMoveUndoCommand(1, QPointF(300.0, 200.0), QPointF(10.0, 20.0));
+    QCOMPARE(canvas.stack.count(), 1);
+    QCOMPARE(canvas.text(1)->scenePos(), QPointF(10.0, 20.0));
+    canvas.stack.undo();
+    QCOMPARE(canvas.text(1)->scenePos(), QPointF(300.0, 200.0));
+    QCOMPARE(canvas.text(1)->getItemTText()->getYValue(), 200.0F);
+    QCOMPARE(canvas.saved()->getText()[0]->getXValue(), 300.0F);
+    canvas.stack.redo();
+    QCOMPARE(canvas.saved()->getText()[0]->getXValue(), 10.0F);
+}
+
+void tst_canvasscene::undoWithoutObject()
+{
+    Canvas canvas;
+    canvas.open({makeRecord("abc")});
+    TText text = makeRecord("x", 3);
+    TText last;
+    canvas.scene->slotCreateEditUndoCommand(&text, &text, &last, &last);
+    canvas.scene->slotCreateMoveUndoCommand(3, QPointF(), QPointF(9.0, 9.0));
+    QFile::remove(QString::fromStdString(canvas.title.getPath()));
+    canvas.stack.undo();
+    canvas.stack.undo();
+    QCOMPARE(canvas.text(1)->toPlainText(), QStringLiteral("abc"));
+    QVERIFY(canvas.saved());
+}
+
+void tst_canvasscene::tapSelectsThenEdits()
+{
+    Canvas canvas;
+    canvas.show();
+    canvas.open({makeRecord("abc")});
+    GraphicsText* item = canvas.text(1);
+    QSignalSpy keyboard(item, &GraphicsText::signalNotifySceneCurrentObjectInEditMode);
+    QSignalSpy modes(canvas.scene.get(), &CanvasScene::signalSceneNotifyTextPropertyAreaObjectSelectionMode);
+    QSignalSpy selected(canvas.scene.get(), &CanvasScene::signalSceneNotifyIfExistSelectedObject);
+    canvas.tap(canvas.pointOn(1));
+    QCOMPARE(item->getFocusFlag(), 1);
+    QCOMPARE(item->getStatusId(), 0);
+    QCOMPARE(item->textInteractionFlags(), Qt::NoTextInteraction);
+    QCOMPARE(modes.last(), QVariantList({true, true}));
+    QCOMPARE(selected.last(), QVariantList({true}));
+    QCOMPARE(keyboard.last().at(0).value<GraphicsText*>(), nullptr);
+    canvas.tap(canvas.pointOn(1));
+    QCOMPARE(item->getFocusFlag(), 0);
+    QCOMPARE(item->textInteractionFlags(), Qt::TextEditorInteraction);
+    QCOMPARE(item->parentTextItem()->getFocusFlag(), 0);
+    QCOMPARE(keyboard.last().at(0).value<GraphicsText*>(), item);
+    QCOMPARE(modes.last(), QVariantList({false, false}));
+    QVERIFY(item->hasFocus());
+    QCOMPARE(canvas.stack.count(), 0);
+}
+
+void tst_canvasscene::secondTapPlacesTheCursor()
+{
+    Canvas canvas;
+    canvas.show();
+    canvas.open({makeRecord("MMMM\nWWWW")});
+    GraphicsText* item = canvas.text(1);
+    for (const int position : {2, 7}) {
+        canvas.scene->clearItemsSelectionAndFocus();
+        QTextCursor before = item->textCursor();
+        before.setPosition(0);
+        item->setTextCursor(before);
+        QTextCursor cursor(item->document());
+        cursor.setPosition(position);
+        const QTextBlock block = cursor.block();
+        const QTextLine line = block.layout()->lineAt(0);
+        const QPointF place(line.cursorToX(position - block.position()) + 27.0,
+                            27.0 + (block.blockNumber() + 0.5) * line.height());
+        const QPoint point = canvas.view.mapFromScene(item->mapToScene(place));
+        canvas.tap(point);
+        canvas.tap(point);
+        QCOMPARE(item->textCursor().position(), position);
+    }
+}
+
+void tst_canvasscene::dragMovesASelectedObject()
+{
+    Canvas canvas;
+    canvas.show();
+    canvas.open({makeRecord("abc")});
+    GraphicsText* item = canvas.text(1);
+    canvas.tap(canvas.pointOn(1));
+    canvas.drag(canvas.pointOn(1), canvas.pointOn(1) + QPoint(60, 30));
+    QCOMPARE(item->getFocusFlag(), 1);
+    QCOMPARE(item->scenePos(), QPointF(360.0, 230.0));
+    QCOMPARE(item->pos(), QPointF());
+    QCOMPARE(item->parentTextItem()->pos(), QPointF(360.0, 230.0));
+    QCOMPARE(canvas.stack.count(), 1);
+    QCOMPARE(canvas.saved()->getText()[0]->getXValue(), 360.0F);
+    canvas.stack.undo();
+    QCOMPARE(item->scenePos(), QPointF(300.0, 200.0));
+    // An object that is not selected stays.
+    canvas.scene->clearItemsSelectionMode();
+    canvas.drag(canvas.pointOn(1), canvas.pointOn(1) + QPoint(60, 30));
+    QCOMPARE(item->scenePos(), QPointF(300.0, 200.0));
+}
+
+void tst_canvasscene::dragStopsAtTheLimit()
+{
+    Canvas canvas;
+    canvas.show();
+    TText record = makeRecord("abcdef");
+    record.setXValue(10.0F);
+    canvas.open({record});
+    GraphicsText* item = canvas.text(1);
+    canvas.tap(canvas.pointOn(1));
+    const QPoint from = canvas.pointOn(1);
+    QTest::mousePress(canvas.view.viewport(), Qt::LeftButton, {}, from);
+    for (int x = from.x(); x > -1500; x -= 40)
+        canvas.sendMove(QPoint(x, from.y()));
+    QTest::mouseRelease(canvas.view.viewport(), Qt::LeftButton, {}, QPoint(5, from.y()));
+    QCOMPARE(item->scenePos().x(), -(item->layoutRect().width() - 100.0));
+    QCOMPARE(item->getFocusFlag(), 1);
+    QCOMPARE(canvas.stack.count(), 1);
+}
+
+void tst_canvasscene::rightButtonDoesNothing()
+{
+    Canvas canvas;
+    canvas.show();
+    canvas.open({makeRecord("abc")});
+    QTest::mouseClick(canvas.view.viewport(), Qt::RightButton, {}, canvas.pointOn(1));
+    QCOMPARE(canvas.text(1)->getFocusFlag(), -1);
+    canvas.tap(canvas.pointOn(1));
+    QCOMPARE(canvas.text(1)->getFocusFlag(), 1);
+}
+
+void tst_canvasscene::releaseOnEmptyCanvas()
+{
+    Canvas canvas;
+    canvas.show();
+    canvas.open({makeRecord("abc")});
+    canvas.tap(canvas.pointOn(1));
+    canvas.tap(canvas.pointOn(1));
+    typeText(*canvas.text(1), "d");
+    QSignalSpy selected(canvas.scene.get(), &CanvasScene::signalSceneNotifyIfExistSelectedObject);
+    QSignalSpy pressed(canvas.scene.get(), &CanvasScene::signalCanvasSceneMousePressed);
+    canvas.tap(EmptyPlace);
+    QCOMPARE(selected.last(), QVariantList({false}));
+    QCOMPARE(pressed.count(), 1);
+    QCOMPARE(canvas.text(1)->getFocusFlag(), -1);
+    QCOMPARE(canvas.text(1)->textInteractionFlags(), Qt::NoTextInteraction);
+    // What was typed became a step.
+    QCOMPARE(canvas.stack.count(), 1);
+}
+
+void tst_canvasscene::emptyObjectGoesAtTheNextRelease()
+{
+    Canvas canvas;
+    canvas.show();
+    canvas.open({makeRecord("abc")});
+    canvas.scene->slotInsertNewTextItem();
+    QVERIFY(canvas.text(2));
+    typeText(*canvas.text(2), "  \n ");
+    canvas.text(2)->pushLastEditTextIntoStack();
+    const int steps = canvas.stack.count();
+    canvas.tap(canvas.pointOn(1));
+    QCOMPARE(canvas.text(2), nullptr);
+    QCOMPARE(canvas.stack.count(), steps + 1);
+    canvas.stack.undo();
+    QVERIFY(canvas.text(2));
+}
+
+void tst_canvasscene::emptyObjectUnderTheFingerStays()
+{
+    Canvas canvas;
+    canvas.show();
+    canvas.open({});
+    canvas.scene->slotInsertNewTextItem();
+    canvas.tap(canvas.pointOn(1));
+    QVERIFY(canvas.text(1));
+    canvas.tap(EmptyPlace);
+    canvas.scene->slotDeleteEmptyItems();
+    QCOMPARE(canvas.text(1), nullptr);
+}
+
+void tst_canvasscene::doubleTapSelectsAll()
+{
+    Canvas canvas;
+    canvas.show();
+    canvas.open({makeRecord("abc def")});
+    GraphicsText* item = canvas.text(1);
+    canvas.tap(canvas.pointOn(1));
+    canvas.tap(canvas.pointOn(1));
+    QTest::mouseDClick(canvas.view.viewport(), Qt::LeftButton, {}, canvas.pointOn(1));
+    QCOMPARE(item->textCursor().selectionStart(), 0);
+    QCOMPARE(item->textCursor().selectionEnd(), 7);
+    QVERIFY(item->isDoubleClickedSelection());
+    QVERIFY(!item->isHandleCaret());
+}
+
+void tst_canvasscene::longPressSelectsACharacter()
+{
+    Canvas canvas;
+    canvas.show();
+    canvas.open({makeRecord("abcdef")});
+    GraphicsText* item = canvas.text(1);
+    canvas.tap(canvas.pointOn(1));
+    canvas.tap(canvas.pointOn(1));
+    QTest::mousePress(canvas.view.viewport(), Qt::LeftButton, {}, canvas.pointOn(1));
+    QVERIFY(!item->textCursor().hasSelection());
+    QTRY_VERIFY_WITH_TIMEOUT(item->textCursor().hasSelection(), 5000);
+    QCOMPARE(item->textCursor().selectionEnd() - item->textCursor().selectionStart(), 1);
+    QVERIFY(item->isHandleCaret());
+    QTest::mouseRelease(canvas.view.viewport(), Qt::LeftButton, {}, canvas.pointOn(1));
+    QVERIFY(item->isHandleCaret());
+}
+
+void tst_canvasscene::handleIsGrabbedBesideItsPicture()
+{
+    Canvas canvas;
+    canvas.show();
+    canvas.open({makeRecord("abcdefgh")});
+    GraphicsText* item = canvas.text(1);
+    canvas.tap(canvas.pointOn(1));
+    canvas.tap(canvas.pointOn(1));
+    item->getSelectionInfo(2, 5, 5, 1);
+    QVERIFY(item->isHandleCaret());
+    QLineF line;
+    QPointF point;
+    int block = 0;
+    QVERIFY(item->textPainter().carets().caretPoint(line, point, block, 5));
+    const QPointF beside = point + QPointF(24.0 + 7.0, 10.0);
+    const QPoint pressed = canvas.view.mapFromScene(item->mapToScene(beside));
+    QTest::mousePress(canvas.view.viewport(), Qt::LeftButton, {}, pressed);
+    // A press beside the handle starts at its other end; a drag selects from there.
+    QVERIFY(item->textPainter().carets().caretPoint(line, point, block, 7));
+    const QPointF target = point + QPointF(12.0, 10.0);
+    canvas.sendMove(canvas.view.mapFromScene(item->mapToScene(target)) + QPoint(0, 5));
+    canvas.sendMove(canvas.view.mapFromScene(item->mapToScene(target)));
+    QVERIFY(item->textCursor().hasSelection());
+    QTest::mouseRelease(canvas.view.viewport(), Qt::LeftButton, {},
+                        canvas.view.mapFromScene(item->mapToScene(target)));
+    QVERIFY(item->textCursor().hasSelection());
+    QVERIFY(item->isHandleCaret());
+}
+
+void tst_canvasscene::keyboardClosedOnText()
+{
+    Canvas canvas;
+    canvas.open({makeRecord("abc")});
+    canvas.text(1)->initNewTextSelectAll();
+    typeTextAt(*canvas.text(1), 3, "d");
+    QSignalSpy closed(canvas.scene.get(), &CanvasScene::signalSceneSoftWareClosedWhenEditObject);
+    QEvent close(QEvent::Type(1100));
+    QCoreApplication::sendEvent(canvas.text(1), &close);
+    QCOMPARE(closed.count(), 1);
+    QCOMPARE(canvas.text(1)->getStatusId(), 0);
+    QCOMPARE(canvas.saved()->getText()[0]->getText(), std::string("abcd"));
+}
+
+void tst_canvasscene::keyboardClosedOnEmptiedObject()
+{
+    Canvas canvas;
+    canvas.open({makeRecord("a"), makeRecord("b", 2)});
+    canvas.text(1)->initNewTextSelectAll();
+    QTextCursor cursor = canvas.text(1)->textCursor();
+    cursor.setPosition(1);
+    cursor.deletePreviousChar();
+    QSignalSpy selected(canvas.scene.get(), &CanvasScene::signalSceneNotifyIfExistSelectedObject);
+    QEvent close(QEvent::Type(1100));
+    QCoreApplication::sendEvent(canvas.text(1), &close);
+    QCOMPARE(canvas.text(1), nullptr);
+    QCOMPARE(selected.last(), QVariantList({false}));
+    QCOMPARE(canvas.saved()->getText().size(), size_t(1));
+}
+
+void tst_canvasscene::keyboardCursor_data()
+{
+    QTest::addColumn<int>("begin");
+    QTest::addColumn<int>("end");
+    QTest::addColumn<int>("current");
+    QTest::addColumn<int>("mode");
+    QTest::addColumn<int>("anchor");
+    QTest::addColumn<int>("position");
+    QTest::addColumn<bool>("handles");
+    QTest::addColumn<bool>("shadow");
+    QTest::newRow("place") << 0 << 0 << 3 << 0 << 3 << 3 << false << false;
+    QTest::newRow("forward") << 1 << 4 << 0 << 1 << 1 << 4 << true << false;
+    QTest::newRow("backward") << 4 << 1 << 0 << 1 << 4 << 1 << true << false;
+    QTest::newRow("everything by hand") << 0 << 6 << 0 << 1 << 0 << 6 << true << true;
+    QTest::newRow("everything") << 0 << 0 << 0 << 2 << 0 << 6 << false << true;
+    QTest::newRow("far outside") << -9 << 900 << 0 << 1 << 0 << 6 << true << true;
+}
+
+void tst_canvasscene::keyboardCursor()
+{
+    QFETCH(int, begin);
+    QFETCH(int, end);
+    QFETCH(int, current);
+    QFETCH(int, mode);
+    QFETCH(int, anchor);
+    QFETCH(int, position);
+    QFETCH(bool, handles);
+    QFETCH(bool, shadow);
+    Canvas canvas;
+    canvas.open({makeRecord("abcdef")});
+    GraphicsText* item = canvas.text(1);
+    item->initNewTextSelectAll();
+    QSignalSpy modes(item, &GraphicsText::signalNotifyTextPropertyAreaObjectSelectionMode);
+    KSSoftKeyboardCursorSettingEvent event(begin, end, current, mode);
+    QCoreApplication::sendEvent(item, &event);
+    QCOMPARE(item->textCursor().anchor(), anchor);
+    QCOMPARE(item->textCursor().position(), position);
+    QCOMPARE(item->isHandleCaret(), handles);
+    QCOMPARE(modes.last(), QVariantList({shadow, false}));
+}
+
+void tst_canvasscene::dataInfo()
+{
+    Canvas canvas;
+    canvas.open({makeRecord("abcdef")});
+    GraphicsText* item = canvas.text(1);
+    QCOMPARE(canvas.scene->getNewTextDataInfo(""), QStringLiteral("0#Text Input#0#300##-1#-1#-1#2##300"));
+    QCOMPARE(canvas.scene->getDoubleClickDataInfo(""), QStringLiteral("0#Text Input#1#300##-1#-1#-1#2##300"));
+    item->initNewTextSelectAll();
+    item->getSelectionInfo(0, 0, 4, 0);
+    QCOMPARE(canvas.scene->getCommonStateDataInfo("", item),
+             QStringLiteral("0#Text Input#1#300##4#4#4#0##300"));
+    item->getSelectionInfo(1, 4, 0, 1);
+    QCOMPARE(canvas.scene->getCommonStateDataInfo("", item),
+             QStringLiteral("0#Text Input#1#300##4#1#4#1##300"));
+    item->getSelectionInfo(4, 1, 0, 1);
+    QCOMPARE(canvas.scene->getCommonStateDataInfo("t", item),
+             QStringLiteral("0#Text Input#1#300#t#1#4#1#1##300"));
+}
+
+void tst_canvasscene::keyboardRequestNamesTheItem()
+{
+    Canvas canvas;
+    canvas.show();
+    canvas.open({});
+    canvas.scene->slotInsertNewTextItem();
+    GraphicsText* item = canvas.text(1);
+    QCOMPARE(item->objectName(), canvas.scene->getNewTextDataInfo(""));
+    // Only the first request of a new object is one for a new text.
+    QTest::keyClick(canvas.view.viewport(), Qt::Key_A);
+    QTest::keyClick(canvas.view.viewport(), Qt::Key_Left);
+    QCOMPARE(item->objectName(), QStringLiteral("0#Text Input#1#300##0#0#0#0##300"));
+}
+
+void tst_canvasscene::deleteSelectedLeavesEmptyOnes()
+{
+    Canvas canvas;
+    canvas.open({makeRecord("abc")});
+    canvas.scene->slotInsertNewTextItem();
+    QSignalSpy selected(canvas.scene.get(), &CanvasScene::signalSceneNotifyIfExistSelectedObject);
+    canvas.scene->deleteSelectedItems();
+    QVERIFY(canvas.text(1));
+    QVERIFY(canvas.text(2));
+    QCOMPARE(selected.last(), QVariantList({false}));
+}
+
+void tst_canvasscene::savesAtOnce()
+{
+    Canvas canvas;
+    TText record = makeRecord(QString::fromUtf8("a😀\nb"));
+    record.textItems()[0]->setFontSize(41);
+    canvas.title.setBgPointZ(-1.0F);
+    canvas.title.setVersion("1");
+    canvas.open({record, makeRecord("two", 2)});
+    canvas.text(1)->parentTextItem()->setPos(12.5, 13.5);
+    canvas.scene->slotSaveArchive(canvas.text(1));
+    const auto saved = canvas.saved();
+    QVERIFY(saved);
+    const TText& first = *saved->getText()[0];
+    QCOMPARE(first.getTextObjectID(), 1);
+    QCOMPARE(first.getText(), std::string("a😀\nb"));
+    QCOMPARE(first.getXValue(), 12.5F);
+    QCOMPARE(first.textItems().size(), size_t(5));
+    QCOMPARE(first.textItems()[0]->getFontSize(), 41);
+    QCOMPARE(first.textItems()[1]->getText(), std::string("😀"));
+    QCOMPARE(first.textItems()[2]->getText(), std::string());
+    QCOMPARE(canvas.log.fast, 1);
+    // Opening what was saved shows the same.
+    canvas.scene->slotUpdateArchive(saved.get());
+    QCOMPARE(canvas.text(1)->toPlainText(), QString::fromUtf8("a😀\nb"));
+    QVERIFY(inStep(*canvas.text(1)));
+}
+
+void tst_canvasscene::picturesFollowTheTitle()
+{
+    Canvas canvas;
+    QSignalSpy ready(canvas.scene.get(), &CanvasScene::signalSaveOk);
+    canvas.scene->slotMakeSceneThumnail();
+    canvas.scene->createThumnailPicture();
+    QCOMPARE(canvas.log.fast + canvas.log.slow, 0);
+    canvas.open({makeRecord("a")});
+    canvas.scene->createThumnailPicture();
+    QCOMPARE(canvas.log.fast, 1);
+    // No file yet: no pictures, and the wish is forgotten.
+    canvas.scene->slotMakeSceneThumnail();
+    QCOMPARE(canvas.log.slow, 0);
+    canvas.scene->saveArchive();
+    canvas.scene->slotMakeSceneThumnail();
+    QCOMPARE(canvas.log.slow, 0);
+    canvas.scene->saveArchiveFlag();
+    canvas.scene->slotMakeSceneThumnail();
+    canvas.scene->slotMakeSceneThumnail();
+    QCOMPARE(canvas.log.slow, 1);
+    Q_EMIT canvas.log.render->saveHalfThumbnailsOK("path", QImage());
+    QCOMPARE(ready.count(), 1);
+    QVERIFY(canvas.scene->isEditFinish());
+    canvas.log.finished = false;
+    QVERIFY(!canvas.scene->isEditFinish());
+}
+
+void tst_canvasscene::withoutRender()
+{
+    CanvasScene scene(nullptr);
+    QVERIFY(scene.isEditFinish());
+    Archive title;
+    title.setText({new TText(makeRecord("a"))});
+    scene.slotUpdateArchive(&title);
+    scene.createThumnailPicture();
+    scene.slotMakeSceneThumnail();
+    scene.saveArchive();
+    // Without a stack and without a view.
+    scene.slotInsertNewTextItem();
+    scene.slotSendCustomEvent(nullptr);
+    QCOMPARE(scene.getTextItemList().size(), 2);
+}
+
+void tst_canvasscene::backgroundBrush()
+{
+    Canvas canvas;
+    QAction action;
+    action.setData(1);
+    canvas.scene->slotShowCanvasBG(&action);
+    QCOMPARE(canvas.scene->backgroundBrush().color(), QColor(Qt::white));
+    action.setData(0);
+    canvas.scene->slotShowCanvasBG(&action);
+    QCOMPARE(canvas.scene->backgroundBrush().color(), QColor(Qt::black));
+    action.setData(2);
+    canvas.scene->slotShowCanvasBG(&action);
+    QCOMPARE(canvas.scene->backgroundBrush().color().alpha(), 0);
+    canvas.scene->slotShowCanvasBG(nullptr);
+    QCOMPARE(canvas.scene->backgroundBrush().color().alpha(), 0);
+}
+
+void tst_canvasscene::safeArea()
+{
+    Canvas canvas;
+    canvas.open({makeRecord("a")});
+    canvas.scene->slotDrawSafeArea(true);
+    canvas.scene->slotDrawSafeArea(true);
+    QList<QRectF> areas;
+    int dotted = 0;
+    const auto items = canvas.scene->items();
+    for (QGraphicsItem* item : items) {
+        if (item->type() != QGraphicsRectItem::Type)
+            continue;
+        auto* line = static_cast<QGraphicsRectItem*>(item);
+        areas.append(line->rect());
+        QCOMPARE(line->pen().widthF(), 2.0);
+        dotted += line->pen().style() == Qt::DotLine && line->pen().color() == QColor(Qt::white);
+        QCOMPARE(line->zValue(), 5.0);
+    }
+    QCOMPARE(areas.size(), 4);
+    QCOMPARE(dotted, 2);
+    QCOMPARE(areas.count(QRectF(64, 36, 1152, 648)), 2);
+    QCOMPARE(areas.count(QRectF(128, 72, 1024, 576)), 2);
+    canvas.open({makeRecord("b")});
+    QCOMPARE(canvas.scene->items().size(), 6);
+    canvas.scene->slotDrawSafeArea(false);
+    QCOMPARE(canvas.scene->items().size(), 2);
+}
+
+void tst_canvasscene::generateThumbnail()
+{
+    Canvas canvas;
+    canvas.open({makeRecord("abc")});
+    const QString path = canvas.folder.path() + "/scene.png";
+    canvas.scene->generateThumbnail(QSize(240, 135), path);
+    QCOMPARE(QImage(path).size(), QSize(240, 135));
+    canvas.scene->generateThumbnail(QSize(), canvas.folder.path() + "/none.png");
+    QVERIFY(!QFileInfo::exists(canvas.folder.path() + "/none.png"));
+}
+
+void tst_canvasscene::switchingTitlesFinishesEditing()
+{
+    Canvas canvas;
+    canvas.open({makeRecord("abc")});
+    canvas.text(1)->initNewTextSelectAll();
+    typeTextAt(*canvas.text(1), 3, "d");
+    QSignalSpy selected(canvas.scene.get(), &CanvasScene::signalSceneNotifyIfExistSelectedObject);
+    Archive other;
+    other.setPath((canvas.folder.path() + "/other.xml").toStdString());
+    canvas.scene->slotUpdateArchive(&other);
+    QCOMPARE(selected.last(), QVariantList({false}));
+    QCOMPARE(canvas.saved()->getText()[0]->getText(), std::string("abcd"));
+    QCOMPARE(canvas.scene->getTextItemList().size(), 0);
+    QVERIFY(!QFileInfo::exists(canvas.folder.path() + "/other.xml"));
+}
+
+QTEST_MAIN(tst_canvasscene)
+#include "tst_canvasscene.moc"

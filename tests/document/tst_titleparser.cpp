@@ -1,0 +1,550 @@
+// The title file and the order file of a folder.
+#include "document/Archive.h"
+#include "document/ArchiveOrder.h"
+#include "document/TText.h"
+#include "document/TitleParser.h"
+#include "document/TitleParserUtility.h"
+#include "support/FileSyncQueue.h"
+
+#include <QDir>
+#include <QElapsedTimer>
+#include <QFile>
+#include <QTemporaryDir>
+#include <QtTest/QTest>
+#include <clocale>
+#include <memory>
+#include <stdexcept>
+#include <tinyxml.h>
+
+namespace
+{
+
+const QByteArray ONE_ITEM = "<text-item text=\"x\" />";
+
+QByteArray title(const QByteArray& metaText)
+{
+    return "<manifest><meta-bg/>" + metaText + "</manifest>";
+}
+
+QByteArray content(const QByteArray& attributes, const QByteArray& items = ONE_ITEM)
+{
+    return "<content " + attributes + ">" + items + "</content>";
+}
+
+std::unique_ptr<Archive> richTitle(const std::string& path)
+{
+    auto archive = std::make_unique<Archive>();
+    archive->setPath(path);
+    archive->setVersion("1.2 <&\"'>");
+    archive->setThumbnailSmall("标题_240.png");
+    archive->setThumbnailBlack("s_240S.png");
+    archive->setThumbnailBig("s_1920.png");
+    archive->setThumbnailMiddle("s_960.png");
+    archive->setClip("1");
+    archive->setGain("2");
+    archive->setDensity("3");
+    archive->setBgResource("/templates/é bg.png");
+    archive->setBgResourceBig("/templates/é big.png");
+    archive->setBgPointX(-12.5f);
+    archive->setBgPointY(1234567.0f);
+    archive->setBgPointZ(-2.0f);
+    std::vector<TText*> texts;
+    const std::vector<std::vector<std::string>> objects = {
+        {"A", "快", "讯", "\n", " "},
+        {"速", "속", "é", "e\xCC\x81", "😀", "👩‍👩‍👧"},
+        {"&", "#", "x", "<", ">", "\"", "'", "\t"}};
+    for (const auto& characters : objects) {
+        auto* text = new TText;
+        std::string whole;
+        std::vector<TextStyle*> items;
+        for (const std::string& character : characters) {
+            whole += character;
+            auto* style = new TextStyle;
+            style->setText(character);
+            style->setFontFamily("Família 字");
+            style->setFontSize(20 + int(items.size()));
+            style->setFontColor("#0a0B0c");
+            style->setFontBold(1);
+            style->setIsTextItalic(int(items.size() % 2));
+            style->setTextKerning(-5);
+            style->setIsTextEdge(1);
+            style->setAlphaDefaultFontOfInputLanguage("Default 體");
+            TEdge edge;
+            edge.setEdgeWidth(11);
+            edge.setEdgeColor("#abcdef");
+            style->setTextEdge(edge);
+            items.push_back(style);
+        }
+        text->setText(whole);
+        text->setTextItems(items);
+        text->setTextObjectID(int(texts.size()) + 1);
+        text->setXValue(100.5f);
+        text->setYValue(-0.25f);
+        text->setZValue(float(texts.size()));
+        text->setTextAlign(int(texts.size()) - 1);
+        text->setShadowStyle(2);
+        text->getTextShadow()->setShadowBlurRadius(18);
+        text->getTextShadow()->setShadowDirectionX(-3);
+        text->getTextShadow()->setShadowDirectionY(4);
+        text->getTextShadow()->setShadowColor("#010203");
+        texts.push_back(text);
+    }
+    archive->setText(texts);
+    return archive;
+}
+
+} // namespace
+
+class TestTitleParser : public QObject
+{
+    Q_OBJECT
+
+private slots:
+    void init() { mFolder = std::make_unique<QTemporaryDir>(); }
+
+    void cleanup() { QVERIFY(FileSyncQueue::flush(std::chrono::seconds(30))); }
+
+    void roundTrip()
+    {
+        const std::string file = path("标题 한국 é.xml");
+        const auto written = richTitle(file);
+        QCOMPARE(mParser.writeOneTitle(written.get()), 1);
+        Archive read;
+        QCOMPARE(mParser.readOneTitle(file, &read), 1);
+        QCOMPARE(read.getPath(), file);
+        QVERIFY(read.getName().empty());
+        QCOMPARE(read.getOrder(), std::string(1, '\xff'));
+        QCOMPARE(read.getVersion(), written->getVersion());
+        QCOMPARE(read.getThumbnailSmall(), written->getThumbnailSmall());
+        QCOMPARE(read.getThumbnailBlack(), written->getThumbnailBlack());
+        QCOMPARE(read.getThumbnailBig(), written->getThumbnailBig());
+        QCOMPARE(read.getThumbnailMiddle(), written->getThumbnailMiddle());
+        QCOMPARE(read.getClip(), std::string("1"));
+        QCOMPARE(read.getGain(), std::string("2"));
+        QCOMPARE(read.getDensity(), std::string("3"));
+        QCOMPARE(read.getBgResource(), written->getBgResource());
+        QCOMPARE(read.getBgResourceBig(), written->getBgResourceBig());
+        QCOMPARE(read.getBgPointX(), -12.5f);
+        QCOMPARE(read.getBgPointY(), 1234570.0f); // six digits
+        QCOMPARE(read.getBgPointZ(), -2.0f);
+        QCOMPARE(read.getText().size(), written->getText().size());
+        for (std::size_t i = 0; i < read.getText().size(); ++i) {
+            QVERIFY(*read.getText()[i] == *written->getText()[i]);
+            QCOMPARE(read.getText()[i]->getTextItems()[0]->getAlphaDefaultFontOfInputLanguage(),
+                     std::string("Default 體"));
+        }
+    }
+
+    void writtenBytes()
+    {
+        Archive archive;
+        archive.setPath(path("t.xml"));
+        archive.setBgPointX(0.1f);
+        auto* text = new TText;
+        text->setText("é");
+        auto* style = new TextStyle;
+        style->setText("é");
+        text->setTextItems({style});
+        archive.setText({text});
+        QCOMPARE(mParser.writeOneTitle(&archive), 1);
+        QCOMPARE(
+            read("t.xml"),
+            QByteArray("<?xml version=\"1.0\" encoding=\"utf-8\" ?>\n"
+                       "<manifest type=\"archive\" version=\"\" thumbnail-small=\"\" thumbnail-black=\"\" "
+                       "thumbnail-big=\"\" thumbnail-mid=\"\" clip=\"0\" gain=\"0\" density=\"100\">\n"
+                       "    <meta-bg resource=\"\" resource-big=\"\" position-X=\"0.1\" position-Y=\"0\" "
+                       "position-Z=\"-1\" />\n"
+                       "    <meta-text content-count=\"1\">\n"
+                       "        <content text=\"é\" id=\"0\" position-X=\"-1\" position-Y=\"-1\" "
+                       "position-Z=\"-1\" text-align=\"-1\" text-shadow=\"0\" shadow-color=\"#123123\" "
+                       "shadow-direction-x=\"0\" shadow-direction-y=\"0\" shadow-blur-radius=\"18\" "
+                       "item-count=\"1\">\n"
+                       "            <text-item text=\"é\" font=\"KST\" size=\"96\" color=\"#FFFFFF\" "
+                       "bold=\"0\" text-kerning=\"100\" text-italic=\"0\" text-edge=\"0\" "
+                       "default-font=\"KST\" edge-width=\"2\" edge-color=\"#000000\" />\n"
+                       "        </content>\n"
+                       "    </meta-text>\n"
+                       "</manifest>\n"));
+    }
+
+    // TinyXML's own writer makes the same bytes of the same document.
+    void writtenBytesAreThoseOfTinyXml()
+    {
+        const auto archive = richTitle(path("t.xml"));
+        archive->getText()[2]->setText("no reference");
+        mParser.writeOneTitle(archive.get());
+        TiXmlDocument document;
+        QVERIFY(document.LoadFile(path("t.xml").c_str(), TIXML_ENCODING_UNKNOWN));
+        QVERIFY(document.SaveFile(path("u.xml").c_str()));
+        QCOMPARE(read("t.xml"), read("u.xml"));
+    }
+
+    void refusals()
+    {
+        Archive archive;
+        QCOMPARE(mParser.writeOneTitle(&archive), 0);
+        QCOMPARE(mParser.writeOneTitle(nullptr), 0);
+        QVERIFY(QDir(mFolder->path()).isEmpty());
+        QCOMPARE(mParser.readOneTitle(path("missing.xml"), &archive), 0);
+        QVERIFY(archive.getPath().empty());
+        QCOMPARE(mParser.readOneTitle(path("missing.xml"), nullptr), 0);
+        // A save that the disk refuses is not reported.
+        archive.setPath(path("no/folder.xml"));
+        QCOMPARE(mParser.writeOneTitle(&archive), 1);
+        archive.setPath("/dev/full");
+        QCOMPARE(mParser.writeOneTitle(&archive), 1);
+    }
+
+    void rootOfAnyName()
+    {
+        write("t.xml", "<anything type=\"no\" version=\"7\"><meta-bg/><meta-text/></anything>");
+        Archive archive;
+        QCOMPARE(mParser.readOneTitle(path("t.xml"), &archive), 1);
+        QCOMPARE(archive.getVersion(), std::string("7"));
+        QVERIFY(archive.getText().empty());
+    }
+
+    void missingAttributesAreEmptyOrZero()
+    {
+        write("t.xml", title("<meta-text>" + content("text=\"x\"") + "</meta-text>"));
+        Archive archive;
+        archive.setClip("9");
+        QCOMPARE(mParser.readOneTitle(path("t.xml"), &archive), 1);
+        QVERIFY(archive.getClip().empty() && archive.getGain().empty() && archive.getDensity().empty());
+        QCOMPARE(archive.getBgPointZ(), 0.0f);
+        const TText& text = *archive.getText()[0];
+        QCOMPARE(text.getXValue(), 0.0f);
+        QCOMPARE(text.getTextAlign(), 0);
+        QCOMPARE(text.getTextObjectID(), 0);
+        QVERIFY(text.getTextShadow()->getShadowColor().empty());
+        QCOMPARE(text.getTextShadow()->getShadowBlurRadius(), 0.0);
+        const TextStyle& style = *text.getTextItems()[0];
+        QCOMPARE(style.getText(), std::string("x"));
+        QVERIFY(style.getFontFamily().empty() && style.getFontColor().empty());
+        QCOMPARE(style.getFontSize(), 0);
+        QCOMPARE(style.getTextKerning(), 0);
+        QCOMPARE(style.getTextEdge().getEdgeWidth(), 0);
+        QVERIFY(style.getTextEdge().getEdgeColor().empty());
+        QCOMPARE(style.getAlphaDefaultFontOfInputLanguage(), std::string("KST"));
+    }
+
+    void attributesInAnyOrder()
+    {
+        write("t.xml",
+              title("<meta-text>" +
+                    content("text=\"x\"", "<text-item edge-color=\"#111111\" more=\"1\" size=\" +12px\" "
+                                          "default-font=\"\" bold=\"0x1\" text-edge=\"99999999999\" "
+                                          "text-kerning=\"word\" text=\"y\" font=\"F\"/>") +
+                    "</meta-text>"));
+        Archive archive;
+        QCOMPARE(mParser.readOneTitle(path("t.xml"), &archive), 1);
+        const TextStyle& style = *archive.getText()[0]->getTextItems()[0];
+        QCOMPARE(style.getText(), std::string("y"));
+        QCOMPARE(style.getFontFamily(), std::string("F"));
+        QCOMPARE(style.getFontSize(), 12);
+        QCOMPARE(style.isFontBold(), 0);
+        QCOMPARE(style.getTextKerning(), 0);
+        QCOMPARE(style.getTextEdge().getEdgeColor(), std::string("#111111"));
+        QCOMPARE(style.getAlphaDefaultFontOfInputLanguage(), std::string("KST"));
+    }
+
+    void partsThatAreMissing()
+    {
+        Archive archive;
+        write("a.xml", "<m version=\"5\" thumbnail-big=\"b\"><meta-text/></m>");
+        QCOMPARE(mParser.readOneTitle(path("a.xml"), &archive), 0);
+        QCOMPARE(archive.getVersion(), std::string("5"));
+        QCOMPARE(archive.getThumbnailBig(), std::string("b"));
+        write("b.xml", "<m><meta-bg resource=\"r\"/></m>");
+        QCOMPARE(mParser.readOneTitle(path("b.xml"), &archive), 0);
+        QCOMPARE(archive.getBgResource(), std::string("r"));
+        write("c.xml", "<?xml version=\"1.0\" ?>");
+        QCOMPARE(mParser.readOneTitle(path("c.xml"), &archive), 0);
+        QCOMPARE(archive.getPath(), path("c.xml"));
+    }
+
+    void unreadableTextObjectsAreDropped()
+    {
+        write("t.xml", title("<meta-text content-count=\"77\">" + content("text=\"one\" item-count=\"0\"") +
+                             content("text=\"\"") + content("id=\"2\"") + content("text=\"no items\"", "") +
+                             content("text=\"two\"", ONE_ITEM + "<other/>" + ONE_ITEM) + "</meta-text>"));
+        Archive archive;
+        QCOMPARE(mParser.readOneTitle(path("t.xml"), &archive), 1);
+        QCOMPARE(archive.getText().size(), std::size_t(2));
+        QCOMPARE(archive.getText()[0]->getText(), std::string("one"));
+        QCOMPARE(archive.getText()[1]->getText(), std::string("two"));
+        QCOMPARE(archive.getText()[1]->getTextItems().size(), std::size_t(2));
+    }
+
+    void blurLosesItsFractionOnWriting()
+    {
+        Archive archive;
+        archive.setPath(path("t.xml"));
+        auto* text = new TText;
+        text->setTextItems({new TextStyle});
+        archive.setText({text});
+        mParser.writeOneTitle(&archive);
+        QVERIFY(read("t.xml").contains("shadow-blur-radius=\"18\""));
+        for (const auto& [value, expected] : {std::pair(1e300, "2147483647"), std::pair(-7.9, "-7")}) {
+            text->getTextShadow()->setShadowBlurRadius(value);
+            mParser.writeOneTitle(&archive);
+            QVERIFY(read("t.xml").contains("shadow-blur-radius=\"" + QByteArray(expected) + "\""));
+        }
+        write("t.xml",
+              title("<meta-text>" + content("text=\"x\" shadow-blur-radius=\"18.3\"") + "</meta-text>"));
+        Archive loaded;
+        QCOMPARE(mParser.readOneTitle(path("t.xml"), &loaded), 1);
+        QCOMPARE(loaded.getText()[0]->getTextShadow()->getShadowBlurRadius(), 18.3);
+    }
+
+    void emptyTextIsLostOnTheNextLoad()
+    {
+        Archive archive;
+        archive.setPath(path("t.xml"));
+        auto* text = new TText;
+        text->setText("");
+        text->setTextItems({new TextStyle});
+        archive.setText({text, nullptr});
+        QCOMPARE(mParser.writeOneTitle(&archive), 1);
+        QVERIFY(read("t.xml").contains("content-count=\"2\"") && read("t.xml").contains("<content />"));
+        Archive loaded;
+        QCOMPARE(mParser.readOneTitle(path("t.xml"), &loaded), 1);
+        QVERIFY(loaded.getText().empty());
+        archive.setText({text});
+    }
+
+    void numbersHaveAPointInEveryLocale()
+    {
+        // A locale with a decimal comma, when the machine has one; the result is the same without.
+        const std::string before = std::setlocale(LC_ALL, nullptr);
+        for (const char* name : {"de_DE.UTF-8", "fr_FR.UTF-8"})
+            std::setlocale(LC_ALL, name);
+        const auto archive = richTitle(path("t.xml"));
+        mParser.writeOneTitle(archive.get());
+        Archive loaded;
+        mParser.readOneTitle(path("t.xml"), &loaded);
+        std::setlocale(LC_ALL, before.c_str());
+        QVERIFY(read("t.xml").contains("position-X=\"-12.5\""));
+        QCOMPARE(loaded.getBgPointX(), -12.5f);
+        QCOMPARE(TitleParserUtility::toDouble(" +1.5e2x"), 150.0);
+        QCOMPARE(TitleParserUtility::toDouble("x"), 0.0);
+        for (const double value : {0.0, -0.0, 1e-5, 123456.0, 1234567.0, 0.1, 1.0 / 3, -1e300}) {
+            char expected[64];
+            std::snprintf(expected, sizeof expected, "%g", value);
+            QCOMPARE(TitleParserUtility::fromDouble(value), std::string(expected));
+        }
+    }
+
+    void propertiesChangeInPlace()
+    {
+        const auto archive = richTitle(path("t.xml"));
+        mParser.writeOneTitle(archive.get());
+        QByteArray expected = read("t.xml");
+        expected.replace(" clip=\"1\"", " clip=\"é&lt;\"").replace(" gain=\"2\"", " gain=\"20\"");
+        expected.replace(" density=\"3\"", " density=\"\"");
+        QCOMPARE(mParser.modifyProp(KeyDefine::TITLE_PROP_CLIP, path("t.xml"), "é<"), 1);
+        QCOMPARE(mParser.modifyGain(path("t.xml"), "20"), 1);
+        QCOMPARE(mParser.modifyProp(KeyDefine::TITLE_PROP_ID_t(2), path("t.xml"), ""), 1);
+        QCOMPARE(read("t.xml"), expected);
+        QCOMPARE(mParser.modifyProp(KeyDefine::TITLE_PROP_ID_t(3), path("t.xml"), "7"), 0);
+        QCOMPARE(read("t.xml"), expected);
+        QCOMPARE(mParser.modifyAttributeValue(path("t.xml"), "new", "v"), 1);
+        QVERIFY(read("t.xml").contains(" new=\"v\">"));
+        QCOMPARE(mParser.modifyDensity(path("missing.xml"), "7"), 0);
+        QVERIFY(!QFile::exists(mFolder->filePath("missing.xml")));
+    }
+
+    void findsNodesByName()
+    {
+        TiXmlDocument document;
+        document.Parse("<a><b n=\"1\"><c n=\"2\"/></b><c n=\"3\"/></a>");
+        TiXmlElement* found = nullptr;
+        QVERIFY(mParser.getNodePointerByName(document.RootElement(), "c", found));
+        QCOMPARE(mParser.getIntAttribute(found, "n"), 2);
+        QVERIFY(mParser.getNodePointerByName(document.RootElement(), "a", found));
+        QCOMPARE(found, document.RootElement());
+        // Siblings of the start are not searched.
+        QVERIFY(!mParser.getNodePointerByName(document.RootElement()->FirstChildElement("b"), "a", found));
+        QVERIFY(!mParser.getNodePointerByName(nullptr, "a", found));
+        QCOMPARE(mParser.getAttribute(nullptr, "n"), std::string());
+        QCOMPARE(mParser.getDoubleAttribute(found, "n"), 0.0);
+    }
+
+    void hostileTitles_data()
+    {
+        QTest::addColumn<QByteArray>("bytes");
+        QTest::newRow("empty") << QByteArray();
+        QTest::newRow("text") << QByteArray("hello");
+        QTest::newRow("picture") << QByteArray("\x89PNG\r\n\x1a\n\0\0\0\rIHDR", 16);
+        QTest::newRow("zeros") << QByteArray(4096, '\0');
+        QTest::newRow("deep") << title(QByteArray("<a>").repeated(50000));
+        QTest::newRow("wide") << "<m" + QByteArray(" a=\"1\"").repeated(20000) +
+                                     "><meta-bg/><meta-text/></m>";
+        QTest::newRow("large") << title("<meta-text/>" + QByteArray(9 << 20, ' '));
+        QTest::newRow("latin1") << title("<meta-text><content text=\"\xe9\"/></meta-text>");
+    }
+
+    void hostileTitles()
+    {
+        QFETCH(QByteArray, bytes);
+        write("t.xml", bytes);
+        write(".order.xml", bytes);
+        Archive archive;
+        QElapsedTimer timer;
+        timer.start();
+        QCOMPARE(mParser.readOneTitle(path("t.xml"), &archive), 0);
+        QCOMPARE(mParser.modifyClip(path("t.xml"), "1"), 0);
+        QVERIFY(mParser.readFileOrderInFolder(folder()).empty());
+        QVERIFY(mParser.getFilsByOrderInFolder(folder()).empty());
+        QVERIFY(timer.elapsed() < 2000);
+        QCOMPARE(read("t.xml"), bytes);
+    }
+
+    void everyTruncation()
+    {
+        const auto archive = richTitle(path("whole.xml"));
+        mParser.writeOneTitle(archive.get());
+        const QByteArray bytes = read("whole.xml");
+        int readable = 0;
+        for (qsizetype size = 0; size < bytes.size(); ++size) {
+            write("t.xml", bytes.left(size));
+            Archive loaded;
+            readable += mParser.readOneTitle(path("t.xml"), &loaded);
+        }
+        QCOMPARE(readable, 1); // without its last line feed
+    }
+
+    void orderTruncations()
+    {
+        mParser.writeFileOrderInFolder(folder(), {row(0, "标题.xml"), row(1, "b.xml")});
+        const QByteArray bytes = read(".order.xml");
+        for (qsizetype size = 0; size < bytes.size(); ++size) {
+            write(".order.xml", bytes.left(size));
+            const auto rows = mParser.readFileOrderInFolder(folder());
+            QCOMPARE(rows.size(), size == bytes.size() - 1 ? std::size_t(2) : std::size_t(0));
+            qDeleteAll(rows);
+        }
+    }
+
+    void orderFile()
+    {
+        QVERIFY(mParser.readFileOrderInFolder(folder()).empty());
+        QCOMPARE(mParser.writeFileOrderInFolder(folder(), {row(5, "a.xml"), row(3, "é 中.xml"), row(1, "")}),
+                 1);
+        QCOMPARE(read(".order.xml"), QByteArray("<?xml version=\"1.0\" encoding=\"utf-8\" ?>\n"
+                                                "<manifest type=\"order\" index-count=\"3\">\n"
+                                                "    <index value=\"5\" file-path=\"a.xml\" />\n"
+                                                "    <index value=\"3\" file-path=\"é 中.xml\" />\n"
+                                                "    <index value=\"1\" file-path=\"\" />\n"
+                                                "</manifest>\n"));
+        auto rows = mParser.readFileOrderInFolder(folder());
+        QCOMPARE(rows.size(), std::size_t(3));
+        QCOMPARE(rows[0]->getArchiveIndex(), 5);
+        QCOMPARE(rows[1]->getArchivePath(), std::string("é 中.xml"));
+        QVERIFY(rows[2]->getArchivePath().empty());
+        qDeleteAll(rows);
+        QCOMPARE(mParser.writeFileOrderInFolder(folder() + "/missing", {}), 1);
+        QCOMPARE(mParser.writeFileOrderInFolder(folder(), {}), 1);
+        QVERIFY(read(".order.xml").contains("index-count=\"0\""));
+    }
+
+    void titlesInOrder()
+    {
+        for (const char* name : {"a.xml", "b.xml", "c.xml", "unnamed.xml"}) {
+            const auto archive = richTitle(path(name));
+            mParser.writeOneTitle(archive.get());
+        }
+        write("broken.xml", "<m>");
+        write(".order.xml",
+              "<any><index value=\"5\" file-path=\"c.xml\"/><index file-path=\"x.xml\"/>"
+              "<index value=\"no\" file-path=\"x.xml\"/><other/><index value=\"3\" "
+              "file-path=\"broken.xml\"/><index value=\"1\"/><index value=\"1\" file-path=\"a.xml\"/>"
+              "</any>");
+        for (int variant = 0; variant < 2; ++variant) {
+            const auto titles = variant == 0 ? mParser.getFilsByOrderInFolder(folder())
+                                             : mParser.getFilesByOrderInFolderWithoutCheck(folder());
+            QCOMPARE(titles.size(), std::size_t(3));
+            QCOMPARE(titles[0]->getName(), std::string("c"));
+            QCOMPARE(titles[0]->getOrder(), std::string("1"));
+            QCOMPARE(titles[0]->getPath(), path("c.xml"));
+            // The row without a path is a blank record; the broken title took position 2.
+            QVERIFY(titles[1]->getName().empty() && titles[1]->getPath().empty());
+            QCOMPARE(titles[1]->getOrder(), std::string(1, '\xff'));
+            QCOMPARE(titles[2]->getName(), std::string("a"));
+            QCOMPARE(titles[2]->getOrder(), std::string("4"));
+            QCOMPARE(titles[2]->getText().size(), std::size_t(3));
+            qDeleteAll(titles);
+        }
+    }
+
+    void templateRowsPointIntoFolders()
+    {
+        QVERIFY(QDir(mFolder->path()).mkdir("UserTemplate_001"));
+        const auto archive = richTitle(path("UserTemplate_001/Titler.xml"));
+        mParser.writeOneTitle(archive.get());
+        mParser.writeFileOrderInFolder(folder(), {row(0, "UserTemplate_001/Titler.xml")});
+        const auto titles = mParser.getFilsByOrderInFolder(folder());
+        QCOMPARE(titles.size(), std::size_t(1));
+        QCOMPARE(titles[0]->getName(), std::string("UserTemplate_001/Titler"));
+        qDeleteAll(titles);
+        mParser.writeFileOrderInFolder(folder(), {row(0, "a.x")});
+        QVERIFY_EXCEPTION_THROWN(mParser.getFilsByOrderInFolder(folder()), std::out_of_range);
+    }
+
+    void listings()
+    {
+        QVERIFY(TitleParserUtility::queryFilesInFolder(folder() + "/missing").empty());
+        QVERIFY(TitleParserUtility::queryChildFolders(folder() + "/missing").empty());
+        for (const char* name : {"a.xml", "b.xml.bak", "C.XML", "d.png", ".order.xml", "中.xml"})
+            write(name, "x");
+        for (const char* name : {"dir.xml", ".hidden", "with.dot", "新闻"})
+            QVERIFY(QDir(mFolder->path()).mkdir(name));
+        auto files = TitleParserUtility::queryFilesInFolder(folder());
+        std::sort(files.begin(), files.end());
+        QCOMPARE(files, std::vector<std::string>(
+                            {path(".order.xml"), path("a.xml"), path("b.xml.bak"), path("中.xml")}));
+        auto folders = TitleParserUtility::queryChildFolders(folder());
+        std::sort(folders.begin(), folders.end());
+        QCOMPARE(folders, std::vector<std::string>({path("dir.xml"), path("with.dot"), path("新闻")}));
+    }
+
+    void strings()
+    {
+        const std::string text = "aé中속😀" + std::string(3000, 'x');
+        QCOMPARE(TitleParserUtility::wstring2String(TitleParserUtility::string2Wstring(text)), text);
+        QCOMPARE(TitleParserUtility::string2Wstring("a\xff"), std::wstring(L"a"));
+        QCOMPARE(TitleParserUtility::char2String(0x0f), std::string("0F"));
+        QCOMPARE(TitleParserUtility::char2String(0xa9), std::string("A9"));
+    }
+
+private:
+    static ArchiveOrder row(int index, const std::string& path)
+    {
+        ArchiveOrder order;
+        order.setArchiveIndex(index);
+        order.setArchivePath(path);
+        return order;
+    }
+
+    std::string folder() const { return mFolder->path().toStdString(); }
+    std::string path(const QString& name) const { return mFolder->filePath(name).toStdString(); }
+
+    QByteArray read(const QString& name) const
+    {
+        QFile file(mFolder->filePath(name));
+        return file.open(QIODevice::ReadOnly) ? file.readAll() : QByteArray();
+    }
+
+    void write(const QString& name, const QByteArray& bytes) const
+    {
+        QFile file(mFolder->filePath(name));
+        if (!file.open(QIODevice::WriteOnly) || file.write(bytes) != bytes.size())
+            qFatal("cannot write %s", qPrintable(name));
+    }
+
+    std::unique_ptr<QTemporaryDir> mFolder;
+    TitleParser mParser;
+};
+
+QTEST_GUILESS_MAIN(TestTitleParser)
+#include "tst_titleparser.moc"

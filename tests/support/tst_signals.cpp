@@ -1,0 +1,117 @@
+// What signals do to a process that has registered the handler.
+#include <QProcess>
+#include <QTest>
+
+#include <csignal>
+
+class TestSignals : public QObject
+{
+    Q_OBJECT
+
+private slots:
+    void terminationCallsBack_data();
+    void terminationCallsBack();
+    void withoutAnEventLoopTheHandlerCallsBack();
+    void faultsLeaveATrace_data();
+    void faultsLeaveATrace();
+    void faultAfterTheTableWasFreed();
+    void harmlessSignalsChangeNothing();
+
+private:
+    static QByteArray readUntil(QProcess& process, const QByteArray& text);
+    static void start(QProcess& process, const QString& mode);
+};
+
+void TestSignals::start(QProcess& process, const QString& mode)
+{
+    process.start(SIGNAL_PROBE, {mode});
+    QVERIFY(process.waitForStarted());
+}
+
+QByteArray TestSignals::readUntil(QProcess& process, const QByteArray& text)
+{
+    QByteArray output;
+    while (!output.contains(text) && process.waitForReadyRead(20000)) {
+        output += process.readAllStandardOutput();
+    }
+    return output;
+}
+
+void TestSignals::terminationCallsBack_data()
+{
+    QTest::addColumn<int>("number");
+    QTest::addColumn<QString>("mode");
+    QTest::newRow("SIGTERM") << SIGTERM << "loop";
+    QTest::newRow("SIGINT") << SIGINT << "loop";
+    QTest::newRow("the second registration counts") << SIGTERM << "twice";
+}
+
+void TestSignals::terminationCallsBack()
+{
+    QFETCH(int, number);
+    QFETCH(QString, mode);
+    QProcess probe;
+    start(probe, mode);
+    QCOMPARE(readUntil(probe, "ready"), QByteArray("ready\n"));
+    kill(static_cast<pid_t>(probe.processId()), number);
+    QVERIFY(probe.waitForFinished());
+    QCOMPARE(probe.readAllStandardOutput(),
+             QByteArray("callback in the main thread\nafter the event loop\n"));
+    QCOMPARE(probe.exitStatus(), QProcess::NormalExit);
+    QCOMPARE(probe.exitCode(), 0);
+}
+
+void TestSignals::withoutAnEventLoopTheHandlerCallsBack()
+{
+    QProcess probe;
+    start(probe, "plain");
+    QCOMPARE(readUntil(probe, "ready"), QByteArray("ready\n"));
+    kill(static_cast<pid_t>(probe.processId()), SIGTERM);
+    QVERIFY(probe.waitForFinished());
+    QCOMPARE(probe.readAllStandardOutput(), QByteArray("callback in the handler\n"));
+    QCOMPARE(probe.exitCode(), 7);
+}
+
+void TestSignals::faultsLeaveATrace_data()
+{
+    QTest::addColumn<int>("number");
+    QTest::newRow("SIGSEGV") << SIGSEGV;
+    QTest::newRow("SIGBUS") << SIGBUS;
+    QTest::newRow("SIGFPE") << SIGFPE;
+    QTest::newRow("SIGQUIT") << SIGQUIT;
+}
+
+void TestSignals::faultsLeaveATrace()
+{
+    QFETCH(int, number);
+    QProcess probe;
+    start(probe, "plain");
+    QCOMPARE(readUntil(probe, "ready"), QByteArray("ready\n"));
+    kill(static_cast<pid_t>(probe.processId()), number);
+    QVERIFY(probe.waitForFinished());
+    QCOMPARE(probe.exitStatus(), QProcess::CrashExit);
+    QCOMPARE(probe.exitCode(), SIGABRT);
+    QVERIFY(probe.readAllStandardError().contains("libk2sys.so.1"));
+}
+
+void TestSignals::faultAfterTheTableWasFreed()
+{
+    QProcess probe;
+    start(probe, "again");
+    QVERIFY(probe.waitForFinished());
+    QCOMPARE(probe.readAllStandardOutput(), QByteArray("aborted once\n"));
+    QCOMPARE(probe.exitStatus(), QProcess::CrashExit);
+    QCOMPARE(probe.exitCode(), SIGABRT);
+}
+
+void TestSignals::harmlessSignalsChangeNothing()
+{
+    QProcess probe;
+    start(probe, "harmless");
+    QVERIFY(probe.waitForFinished());
+    QCOMPARE(probe.readAllStandardOutput(), QByteArray("alive\n"));
+    QCOMPARE(probe.exitStatus(), QProcess::NormalExit);
+}
+
+QTEST_GUILESS_MAIN(TestSignals)
+#include "tst_signals.moc"

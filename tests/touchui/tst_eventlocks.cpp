@@ -1,0 +1,521 @@
+// Who may hold the touch: the lock kinds, the filter that asks them, and the lock between processes.
+#include "touchui/ITitlerAPPEventFilterController.h"
+#include "touchui/KSAppEventFilter.h"
+#include "touchui/KSEventClusterLockObject.h"
+#include "touchui/KSEventDefaultMutexLockObject.h"
+#include "touchui/KSEventMultiMutexLockObject.h"
+#include "touchui/KSEventMutexLockObject.h"
+#include "touchui/KSEventProcessLockObject.h"
+#include "touchui/TouchEventButton.h"
+
+#include <QSignalSpy>
+#include <QTest>
+#include <QTimer>
+#include <QTouchEvent>
+
+using namespace APPEventDefine;
+
+namespace
+{
+
+class FakeController : public ITitlerAPPEventFilterController
+{
+public:
+    void initialize(TitlerToolFactory*) override {}
+    void sendAPPEvent(LOCKTYPE type, bool on) override { sent.append({type, on}); }
+    void informRestoreOriginal(EventRevicer receiver) override { informed.append(receiver); }
+
+    QList<QPair<int, bool>> sent;
+    QList<int> informed;
+};
+
+// Counts what reaches it, and swallows what it is told to.
+class Listener : public QObject
+{
+public:
+    bool eventFilter(QObject* obj, QEvent* event) override
+    {
+        if (obj->isWidgetType() && event->type() == type) {
+            ++count;
+            return swallow;
+        }
+        return false;
+    }
+    QEvent::Type type = QEvent::None;
+    int count = 0;
+    bool swallow = false;
+};
+
+class EventCounter : public QObject
+{
+public:
+    bool event(QEvent* event) override
+    {
+        types.append(event->type());
+        return QObject::event(event);
+    }
+    QList<int> types;
+};
+
+_tagAPPEvent remoteEvent(int type, bool flag)
+{
+    _tagAPPEvent event;
+    event.lockType = type;
+    event.flag = flag;
+    return event;
+}
+
+} // namespace
+
+class TestEventLocks : public QObject
+{
+    Q_OBJECT
+
+private Q_SLOTS:
+    void initTestCase();
+    void init();
+    void cleanup();
+
+    void mutexHasOneHolder();
+    void clusterTakesFive();
+    void multiMutexForwards();
+    void multiMutexRefusesOtherObjects();
+    void defaultMutexWatchdog();
+    void priorities();
+    void createAndRegister();
+
+    void secondButtonIsLockedOut();
+    void sameWidgetTakesASecondFinger();
+    void updateWithoutLockIsSwallowed();
+    void disabledWidgetIsShut();
+    void gestureIsSwallowed();
+    void cancelFreesTheLock();
+    void forcedLockBreaksTheTouch();
+    void registeredFiltersHearInOrder();
+    void deletedFilterLeaves();
+
+    void processLockAnnounces();
+    void remoteLockShutsEveryTouch();
+    void pressAsksTheOtherProcessToGiveWay();
+    void restoreAllReachesTheRememberedObject();
+
+private:
+    void touch(TouchEventButton* button, int id);
+    void lift(TouchEventButton* button, int id);
+
+    QPointingDevice* m_device = nullptr;
+    std::unique_ptr<KSAppEventFilter> m_filter;
+    std::unique_ptr<FakeController> m_controller;
+    std::unique_ptr<QWidget> m_window;
+    TouchEventButton* m_first = nullptr;
+    TouchEventButton* m_second = nullptr;
+};
+
+void TestEventLocks::initTestCase()
+{
+    m_device = QTest::createTouchDevice();
+}
+
+void TestEventLocks::init()
+{
+    m_controller = std::make_unique<FakeController>();
+    ITitlerAPPEventFilterController::setInstance(m_controller.get());
+    m_filter = std::make_unique<KSAppEventFilter>();
+    m_filter->registerLockObject(m_filter.get(), nullptr, LOCKOBJECT_DEFAULTMUTEX, nullptr);
+    qApp->installEventFilter(m_filter.get());
+    m_window = std::make_unique<QWidget>();
+    m_window->resize(400, 200);
+    m_first = new TouchEventButton(QStringLiteral("first"), m_window.get());
+    m_first->setGeometry(10, 10, 100, 60);
+    m_second = new TouchEventButton(QStringLiteral("second"), m_window.get());
+    m_second->setGeometry(200, 10, 100, 60);
+    m_window->show();
+    QVERIFY(QTest::qWaitForWindowExposed(m_window.get()));
+}
+
+void TestEventLocks::cleanup()
+{
+    m_window.reset();
+    m_filter.reset();
+    m_controller.reset();
+    QVERIFY(ITitlerAPPEventFilterController::getInstance() == nullptr);
+}
+
+void TestEventLocks::mutexHasOneHolder()
+{
+    const std::unique_ptr<KSLockObject> lock(KSEventMutexLockObject::createFactory(nullptr));
+    QObject a;
+    QObject b;
+    QCOMPARE(lock->tryLock(&a, LOCKMETHOD_TOUCH, nullptr), -1);
+    QCOMPARE(lock->tryUnlock(&a, LOCKMETHOD_TOUCH), -1);
+    QCOMPARE(lock->registerObj(&a), 0);
+    QCOMPARE(lock->registerObj(&a), 0);
+    QCOMPARE(lock->registerObj(&b), 0);
+    QCOMPARE(lock->registeredObj().size(), 2);
+    QCOMPARE(lock->tryUnlock(&a, LOCKMETHOD_TOUCH), 0); // free already
+    QCOMPARE(lock->tryLock(&a, LOCKMETHOD_TOUCH, nullptr), 0);
+    QCOMPARE(lock->tryLock(&a, LOCKMETHOD_TOUCH, nullptr), 0);
+    QCOMPARE(lock->tryLock(&b, LOCKMETHOD_TOUCH, nullptr), -1);
+    QVERIFY(lock->isLocked());
+    QVERIFY(lock->isLockedObj(&a, LOCKMETHOD_TOUCH));
+    QVERIFY(!lock->isLockedObj(&b, LOCKMETHOD_TOUCH));
+    QCOMPARE(lock->tryUnlock(&b, LOCKMETHOD_TOUCH), -1);
+    QCOMPARE(lock->tryUnlock(&a, LOCKMETHOD_TOUCH), 0);
+    QVERIFY(!lock->isLocked());
+    lock->unregisterObj(&a);
+    QVERIFY(!lock->isRegisterObj(&a));
+}
+
+void TestEventLocks::clusterTakesFive()
+{
+    const std::unique_ptr<KSLockObject> lock(KSEventClusterLockObject::createFactory(nullptr));
+    QObject objects[6];
+    QObject stranger;
+    QCOMPARE(lock->tryLock(&stranger, LOCKMETHOD_TOUCH, nullptr), -1);
+    for (QObject& object : objects) {
+        lock->registerObj(&object);
+    }
+    for (int i = 0; i < 5; ++i) {
+        QCOMPARE(lock->tryLock(&objects[i], LOCKMETHOD_TOUCH, nullptr), 0);
+    }
+    QCOMPARE(lock->tryLock(&objects[5], LOCKMETHOD_TOUCH, nullptr), -1);
+    QVERIFY(!lock->isLockedObj(&objects[5], LOCKMETHOD_TOUCH));
+    QCOMPARE(lock->tryUnlock(&stranger, LOCKMETHOD_TOUCH), -1);
+    QCOMPARE(lock->tryUnlock(&objects[0], LOCKMETHOD_TOUCH), 0);
+    QVERIFY(lock->isLocked());
+    QCOMPARE(lock->tryLock(&objects[5], LOCKMETHOD_TOUCH, nullptr), 0);
+    for (int i = 1; i < 6; ++i) {
+        QCOMPARE(lock->tryUnlock(&objects[i], LOCKMETHOD_TOUCH), 0);
+    }
+    QVERIFY(!lock->isLocked());
+}
+
+void TestEventLocks::multiMutexForwards()
+{
+    const std::unique_ptr<KSLockObject> group(KSEventMultiMutexLockObject::createFactory(nullptr));
+    const std::unique_ptr<KSLockObject> one(KSEventMutexLockObject::createFactory(nullptr));
+    const std::unique_ptr<KSLockObject> two(KSEventMutexLockObject::createFactory(nullptr));
+    QObject a;
+    QObject b;
+    one->registerObj(&a);
+    two->registerObj(&b);
+    QVERIFY(group->isLocked()); // an empty group
+    QCOMPARE(group->tryLock(&a, LOCKMETHOD_TOUCH, nullptr), -1);
+    QCOMPARE(group->registerObj(one.get()), 0);
+    QCOMPARE(group->registerObj(two.get()), 0);
+    QVERIFY(group->isRegisterObj(&a));
+    QVERIFY(!group->isLocked());
+    QCOMPARE(group->tryLock(&a, LOCKMETHOD_TOUCH, nullptr), 0);
+    QVERIFY(group->isLockedObj(&a, LOCKMETHOD_TOUCH));
+    QVERIFY(!group->isLocked());
+    QCOMPARE(group->tryLock(&b, LOCKMETHOD_TOUCH, nullptr), 0);
+    QVERIFY(group->isLocked());
+    group->reset();
+    QVERIFY(!one->isLocked());
+    QVERIFY(!two->isLocked());
+    QCOMPARE(group->unregisterObj(one.get()), 0);
+    QVERIFY(!group->isRegisterObj(&a));
+}
+
+void TestEventLocks::multiMutexRefusesOtherObjects()
+{
+    const std::unique_ptr<KSLockObject> group(KSEventMultiMutexLockObject::createFactory(nullptr));
+    QObject plain;
+    QCOMPARE(group->registerObj(&plain), -1);
+    QCOMPARE(group->registerObj(m_first), -1);
+    QCOMPARE(group->registerObj(nullptr), -1);
+    QCOMPARE(group->registerObj(group.get()), -1);
+    QCOMPARE(group->registerObj(KSEventDefaultMutexLockObject::createFactory(m_filter.get(), nullptr)), -1);
+    QCOMPARE(group->unregisterObj(&plain), -1);
+    QVERIFY(group->registeredObj().isEmpty());
+}
+
+void TestEventLocks::defaultMutexWatchdog()
+{
+    auto* lock = KSEventDefaultMutexLockObject::createFactory(m_filter.get(), nullptr);
+    auto* timer = lock->findChild<QTimer*>();
+    QVERIFY(timer != nullptr && !timer->isActive());
+    touch(m_first, 0);
+    QVERIFY(timer->isActive());
+    QCOMPARE(timer->interval(), 10000);
+    // Each update of the holder starts the time anew; a second begin does not.
+    timer->start(5000);
+    QCOMPARE(lock->tryLock(m_first, LOCKMETHOD_TOUCH, nullptr), 0);
+    QCOMPARE(timer->interval(), 5000);
+    QTest::touchEvent(m_first, m_device).move(0, QPoint(22, 20));
+    QCOMPARE(timer->interval(), 10000);
+    timer->start(0);
+    QTRY_VERIFY(!m_filter->isLock(nullptr, LOCKMETHOD_TOUCH));
+    QVERIFY(!lock->isLocked());
+    // The finger that held it is shut out until its next touch.
+    QSignalSpy clicked(m_first, &QAbstractButton::clicked);
+    lift(m_first, 0);
+    QCOMPARE(clicked.count(), 0);
+}
+
+void TestEventLocks::priorities()
+{
+    auto* mutex = static_cast<KSEventMutexLockObject*>(
+        m_filter->registerLockObject(m_first, nullptr, LOCKOBJECT_MUTEX, nullptr));
+    QVERIFY(mutex != nullptr);
+    touch(m_first, 0);
+    QVERIFY(mutex->isLocked()); // asked before the lock of last resort
+    QVERIFY(!KSEventDefaultMutexLockObject::createFactory(m_filter.get(), nullptr)->isLocked());
+    QCOMPARE(m_filter->activateLockObjects().value(mutex), QList<QObject*>{m_first});
+    lift(m_first, 0);
+    QVERIFY(!mutex->isLocked());
+    m_filter->removeRegLockObject(mutex);
+    touch(m_first, 0);
+    QVERIFY(!mutex->isLocked());
+    lift(m_first, 0);
+}
+
+void TestEventLocks::createAndRegister()
+{
+    QObject a;
+    QObject b;
+    KSLockObject* cluster =
+        m_filter->registerLockObject(QList<QObject*>{&a, &b}, nullptr, LOCKOBJECT_CLUSTER, nullptr);
+    QVERIFY(cluster->isRegisterObj(&a));
+    QVERIFY(cluster->isRegisterObj(&b));
+    QCOMPARE(m_filter->unregisterLockObject(&a, cluster), 0);
+    QVERIFY(!cluster->isRegisterObj(&a));
+    QCOMPARE(m_filter->unregisterLockObject(&a, nullptr), 0);
+    // A multi mutex takes only locks, so making one for another object is refused.
+    QVERIFY(m_filter->createLockObject(&a, nullptr, LOCKOBJECT_MULTIMUTEX, nullptr) == nullptr);
+    QVERIFY(m_filter->createLockObject(&a, nullptr, LOCKOBJECT_PROCESS, nullptr) == nullptr);
+    QVERIFY(m_filter->createLockObject(&a, nullptr, static_cast<LOCKOBJECT_TYPE>(9), nullptr) == nullptr);
+    QCOMPARE(m_filter->createLockObject(&a, cluster, LOCKOBJECT_DEFAULTMUTEX, nullptr),
+             KSEventDefaultMutexLockObject::createFactory(m_filter.get(), nullptr));
+}
+
+void TestEventLocks::touch(TouchEventButton* button, int id)
+{
+    QTest::touchEvent(button, m_device).press(id, QPoint(20, 20));
+}
+
+void TestEventLocks::lift(TouchEventButton* button, int id)
+{
+    QTest::touchEvent(button, m_device).release(id, QPoint(20, 20));
+}
+
+void TestEventLocks::secondButtonIsLockedOut()
+{
+    QSignalSpy first(m_first, &QAbstractButton::clicked);
+    QSignalSpy second(m_second, &QAbstractButton::clicked);
+    auto fingers = QTest::touchEvent(m_window.get(), m_device, false);
+    fingers.press(0, QPoint(20, 20), m_first).commit();
+    fingers.stationary(0).press(1, QPoint(20, 20), m_second).commit();
+    QVERIFY(m_first->isDown());
+    QVERIFY(!m_second->isDown());
+    fingers.stationary(0).release(1, QPoint(20, 20), m_second).commit();
+    QVERIFY(m_first->isDown());
+    fingers.release(0, QPoint(20, 20), m_first).commit();
+    QCOMPARE(first.count(), 1);
+    QCOMPARE(second.count(), 0);
+    touch(m_second, 0);
+    lift(m_second, 0);
+    QCOMPARE(second.count(), 1);
+}
+
+void TestEventLocks::sameWidgetTakesASecondFinger()
+{
+    QSignalSpy points(m_first, &TouchEventButton::signalPressedPoint);
+    touch(m_first, 0);
+    QCOMPARE(points.count(), 1);
+    // A begin of its own for the holder passes.
+    QTouchEvent begin(QEvent::TouchBegin, m_device, Qt::NoModifier,
+                      {QEventPoint(1, QEventPoint::Pressed, QPointF(30, 30), QPointF(30, 30))});
+    QCoreApplication::sendEvent(m_first, &begin);
+    QCOMPARE(points.count(), 2);
+    lift(m_first, 0);
+}
+
+void TestEventLocks::updateWithoutLockIsSwallowed()
+{
+    QTouchEvent update(QEvent::TouchUpdate, m_device);
+    QVERIFY(m_filter->doEventFilter(m_first, &update));
+    QTouchEvent end(QEvent::TouchEnd, m_device);
+    QVERIFY(m_filter->doEventFilter(m_first, &end));
+    QEvent other(QEvent::User);
+    QCOMPARE(m_filter->doLock(m_first, &other), 1);
+    QCOMPARE(m_filter->getLockMethod(&update), LOCKMETHOD_TOUCH);
+    QCOMPARE(m_filter->getLockMethod(&other), LOCKMETHOD_OTHER);
+    const QEvent press(QEvent::MouseButtonPress);
+    QCOMPARE(m_filter->getLockMethod(const_cast<QEvent*>(&press)), LOCKMETHOD_MOUSE);
+}
+
+void TestEventLocks::disabledWidgetIsShut()
+{
+    QSignalSpy begun(m_filter.get(), &KSAppEventFilter::signalEventBegin);
+    QSignalSpy points(m_first, &TouchEventButton::signalPressedPoint);
+    m_first->setEnabled(false);
+    touch(m_first, 0);
+    QCOMPARE(begun.count(), 1);
+    QCOMPARE(points.count(), 0);
+    QVERIFY(!m_filter->isLock(nullptr, LOCKMETHOD_TOUCH));
+    lift(m_first, 0);
+}
+
+void TestEventLocks::gestureIsSwallowed()
+{
+    QEvent gesture(QEvent::Gesture);
+    QVERIFY(m_filter->doEventFilter(m_first, &gesture));
+    QEvent other(QEvent::Timer);
+    QVERIFY(!m_filter->doEventFilter(m_first, &other));
+}
+
+void TestEventLocks::cancelFreesTheLock()
+{
+    touch(m_first, 0);
+    QVERIFY(m_filter->isLock(nullptr, LOCKMETHOD_TOUCH));
+    QTouchEvent cancel(QEvent::TouchCancel, m_device);
+    QCoreApplication::sendEvent(m_first, &cancel);
+    QVERIFY(!m_filter->isLock(nullptr, LOCKMETHOD_TOUCH));
+    lift(m_first, 0);
+}
+
+void TestEventLocks::forcedLockBreaksTheTouch()
+{
+    const std::unique_ptr<KSLockObject> forced(KSEventMutexLockObject::createFactory(nullptr));
+    QSignalSpy clicked(m_first, &QAbstractButton::clicked);
+    touch(m_first, 0);
+    m_filter->lock(forced.get());
+    QCOMPARE(m_filter->activateLockObjects().keys(), QList<KSLockObject*>{forced.get()});
+    QVERIFY(m_filter->activateLockObjects().value(forced.get()).isEmpty());
+    lift(m_first, 0);
+    QCOMPARE(clicked.count(), 0);
+    touch(m_second, 0);
+    QVERIFY(!m_second->isDown());
+    lift(m_second, 0);
+    m_filter->unlock();
+    QVERIFY(!m_filter->isLock(nullptr, LOCKMETHOD_TOUCH));
+}
+
+void TestEventLocks::registeredFiltersHearInOrder()
+{
+    Listener one;
+    Listener two;
+    one.type = two.type = QEvent::MouseButtonPress;
+    m_filter->registerEventFilter(&one);
+    m_filter->registerEventFilter(&one);
+    m_filter->registerEventFilter(&two);
+    m_filter->registerEventFilter(nullptr);
+    QTest::mouseClick(m_first, Qt::LeftButton);
+    QCOMPARE(one.count, 1);
+    QCOMPARE(two.count, 1);
+    one.swallow = true;
+    QSignalSpy clicked(m_first, &QAbstractButton::clicked);
+    QTest::mouseClick(m_first, Qt::LeftButton);
+    QCOMPARE(one.count, 2);
+    QCOMPARE(two.count, 1);
+    QCOMPARE(clicked.count(), 0);
+    m_filter->unegisterEventFilter(&one);
+    QTest::mouseClick(m_first, Qt::LeftButton);
+    QCOMPARE(one.count, 2);
+    QCOMPARE(two.count, 2);
+}
+
+void TestEventLocks::deletedFilterLeaves()
+{
+    auto gone = std::make_unique<Listener>();
+    gone->type = QEvent::MouseButtonPress;
+    gone->swallow = true;
+    m_filter->registerEventFilter(gone.get());
+    gone.reset();
+    QSignalSpy clicked(m_first, &QAbstractButton::clicked);
+    QTest::mouseClick(m_first, Qt::LeftButton);
+    QCOMPARE(clicked.count(), 1);
+}
+
+void TestEventLocks::processLockAnnounces()
+{
+    auto* process = new KSEventProcessLockObject(m_filter.get());
+    QCOMPARE(m_filter->registerLockObject(m_filter.get(), process, LOCKOBJECT_PROCESS, nullptr), process);
+    touch(m_first, 0);
+    QCOMPARE(m_controller->sent, (QList<QPair<int, bool>>{{1, true}}));
+    QVERIFY(process->isLocallyLocked());
+    lift(m_first, 0);
+    QCOMPARE(m_controller->sent, (QList<QPair<int, bool>>{{1, true}, {1, false}}));
+    m_filter->resetLock();
+    QCOMPARE(m_controller->sent.size(), 3);
+    QCOMPARE(m_controller->sent.constLast(), (QPair<int, bool>{1, false}));
+    // Asked directly it never takes the touch, and it can never be passed.
+    QCOMPARE(process->tryLock(m_first, LOCKMETHOD_TOUCH, nullptr), -1);
+    QCOMPARE(m_controller->sent.constLast(), (QPair<int, bool>{2, true}));
+    QCOMPARE(process->tryUnlock(m_first, LOCKMETHOD_TOUCH), -1);
+    QCOMPARE(m_controller->sent.constLast(), (QPair<int, bool>{2, false}));
+    QVERIFY(!process->isRegisterObj(m_filter.get()));
+    QVERIFY(!process->isLocked());
+    QVERIFY(process->registeredObj().isEmpty());
+}
+
+void TestEventLocks::remoteLockShutsEveryTouch()
+{
+    auto* process = new KSEventProcessLockObject(m_filter.get());
+    m_filter->registerLockObject(m_filter.get(), process, LOCKOBJECT_PROCESS, nullptr);
+    QSignalSpy clicked(m_first, &QAbstractButton::clicked);
+    touch(m_first, 0);
+    m_controller->sent.clear();
+    process->slotGetAppEvent(remoteEvent(1, true));
+    QVERIFY(m_controller->sent.isEmpty()); // its own lock is no news
+    lift(m_first, 0);
+    QCOMPARE(clicked.count(), 0);
+    touch(m_second, 0);
+    QVERIFY(!m_second->isDown());
+    lift(m_second, 0);
+    // Both kinds must be given up.
+    process->slotGetAppEvent(remoteEvent(2, true));
+    process->slotGetAppEvent(remoteEvent(1, false));
+    QVERIFY(m_filter->isLock(nullptr, LOCKMETHOD_TOUCH));
+    process->slotGetAppEvent(remoteEvent(2, false));
+    QVERIFY(!m_filter->isLock(nullptr, LOCKMETHOD_TOUCH));
+    touch(m_second, 0);
+    QVERIFY(m_second->isDown());
+    lift(m_second, 0);
+}
+
+void TestEventLocks::pressAsksTheOtherProcessToGiveWay()
+{
+    auto* process = new KSEventProcessLockObject(m_filter.get());
+    m_filter->registerLockObject(m_filter.get(), process, LOCKOBJECT_PROCESS, nullptr);
+    connect(m_filter.get(), &KSAppEventFilter::signalEventBegin, process,
+            &KSEventProcessLockObject::slotRestoreOriginal, Qt::DirectConnection);
+    QTest::mouseClick(m_first, Qt::LeftButton);
+    QVERIFY(m_controller->informed.isEmpty());
+    process->slotGetAppEvent(remoteEvent(2, true));
+    touch(m_first, 0);
+    lift(m_first, 0);
+    QCOMPARE(m_controller->informed, QList<int>{0});
+    process->slotGetAppEvent(remoteEvent(1, true));
+    QTest::mouseClick(m_first, Qt::LeftButton);
+    QCOMPARE(m_controller->informed.size(), 1);
+    // Without a controller nothing is sent and nothing breaks.
+    ITitlerAPPEventFilterController::setInstance(nullptr);
+    process->slotGetAppEvent(remoteEvent(1, false));
+    QTest::mouseClick(m_first, Qt::LeftButton);
+    QCOMPARE(m_controller->informed.size(), 1);
+}
+
+void TestEventLocks::restoreAllReachesTheRememberedObject()
+{
+    KSEventProcessLockObject process(m_filter.get());
+    auto object = std::make_unique<EventCounter>();
+    process.tryLock(object.get(), LOCKMETHOD_TOUCH, nullptr);
+    process.tryLock(nullptr, LOCKMETHOD_TOUCH, nullptr); // keeps what is remembered
+    process.slotRestoreAll();
+    QCOMPARE(object->types, QList<int>{1001});
+    QObject other;
+    process.tryUnlock(&other, LOCKMETHOD_TOUCH);
+    process.slotRestoreAll();
+    QCOMPARE(object->types.size(), 2);
+    process.tryUnlock(object.get(), LOCKMETHOD_TOUCH);
+    process.slotRestoreAll();
+    QCOMPARE(object->types.size(), 2);
+    process.tryLock(object.get(), LOCKMETHOD_TOUCH, nullptr);
+    object.reset();
+    process.slotRestoreAll(); // a closed popup is forgotten
+}
+
+QTEST_MAIN(TestEventLocks)
+#include "tst_eventlocks.moc"
