@@ -328,4 +328,4 @@ void TestRecords::sessionResultThatLies()
 }
 
 QTEST_GUILESS_MAIN(TestRecords)
-#include "tst_records.moc"
+#include "tst_wirerecords.moc"
