@@ -2,7 +2,6 @@
 
 #include <QCache>
 #include <QChar>
-#include <QGlyphRun>
 #include <QHash>
 #include <QPainterPathStroker>
 #include <QRawFont>
@@ -52,39 +51,61 @@ bool isPictureFont(const QRawFont& font)
     return found.value();
 }
 
-bool drawnAsPicture(const QFont& font, const QString& text)
+QList<QGlyphRun> shaped(const QFont& font, const QString& text)
 {
-    if (!mayBePicture(text))
-        return false;
     QTextLayout layout(text, font);
     layout.beginLayout();
-    layout.createLine();
+    const QTextLine line = layout.createLine();
     layout.endLayout();
-    const QList<QGlyphRun> runs = layout.glyphRuns();
+    if (!line.isValid())
+        return {};
+    QList<QGlyphRun> runs = layout.glyphRuns();
+    for (QGlyphRun& run : runs) {
+        QList<QPointF> positions = run.positions();
+        for (QPointF& position : positions)
+            position.ry() -= line.ascent();
+        run.setPositions(positions);
+    }
+    return runs;
+}
+
+bool drawnAsPicture(const QList<QGlyphRun>& runs)
+{
     return std::any_of(runs.begin(), runs.end(),
                        [](const QGlyphRun& run) { return isPictureFont(run.rawFont()); });
 }
 
-int bytesOf(const QPainterPath& path)
-{
-    return path.elementCount() * int(sizeof(QPainterPath::Element));
-}
-
 } // namespace
 
-GlyphPath::GlyphPath(const QFont& font, const QString& text) : m_hasPath(!drawnAsPicture(font, text))
+GlyphPath::GlyphPath(const QFont& font, const QString& text)
+    : m_font(font), m_text(text), m_hasPath(!mayBePicture(text) || !drawnAsPicture(runs()))
 {
-    if (!m_hasPath)
-        return;
-    m_fill.addText(0.0, 0.0, font, text);
-    // Contours of one glyph may overlap.
-    m_fill.setFillRule(Qt::WindingFill);
+}
+
+const QPainterPath& GlyphPath::fill() const
+{
+    if (!m_fillMade) {
+        m_fill.addText(0.0, 0.0, m_font, m_text);
+        // Contours of one glyph may overlap.
+        m_fill.setFillRule(Qt::WindingFill);
+        m_fillMade = true;
+    }
+    return m_fill;
+}
+
+const QList<QGlyphRun>& GlyphPath::runs() const
+{
+    if (!m_runsMade) {
+        m_runs = shaped(m_font, m_text);
+        m_runsMade = true;
+    }
+    return m_runs;
 }
 
 const QPainterPath& GlyphPath::contour() const
 {
     if (!m_contourMade) {
-        m_contour = m_fill.simplified();
+        m_contour = fill().simplified();
         m_contourMade = true;
     }
     return m_contour;
@@ -110,8 +131,10 @@ const QPainterPath& GlyphPath::outline(int penWidth) const
 
 int GlyphPath::cost() const
 {
-    // Outlines come later and are about four times their contour; counted in advance.
-    return int(sizeof(GlyphPath)) + 6 * bytesOf(m_fill);
+    // Counted in advance: contours have some forty points, Chinese ones a hundred, and outlines four times as
+    // many.
+    const int points = m_text.isEmpty() || m_text.at(0).unicode() < 0x2E80 ? 40 : 100;
+    return int(sizeof(GlyphPath)) + 6 * points * int(sizeof(QPainterPath::Element));
 }
 
 std::shared_ptr<const GlyphPath> GlyphPathCache::glyph(const QFont& font, const QString& text)

@@ -1,12 +1,15 @@
 #pragma once
 
 #include <QFont>
+#include <QGlyphRun>
+#include <QList>
 #include <QPainterPath>
 #include <QString>
 #include <memory>
 #include <vector>
 
-// Outline of one character (with its marks) at the origin of its baseline. Made once per font and text.
+// Shape of one character (with its marks) at the origin of its baseline. Each form of it is made when it is
+// first asked for, once per font and text.
 class GlyphPath
 {
 public:
@@ -14,13 +17,15 @@ public:
 
     // False for characters without an outline, which only the font system can draw: colour emoji.
     bool hasPath() const { return m_hasPath; }
-    const QPainterPath& fill() const { return m_fill; }
+    const QPainterPath& fill() const;
     // The area that a pen of the width covers on the merged contour. Width at least 1.
     const QPainterPath& outline(int penWidth) const;
     // The merged contour itself, for hairlines.
     const QPainterPath& contour() const;
+    // The glyphs as the font system draws them; positions are relative to the baseline.
+    const QList<QGlyphRun>& runs() const;
 
-    // Bytes, roughly.
+    // Bytes, roughly, of all forms.
     int cost() const;
 
 private:
@@ -29,10 +34,15 @@ private:
         QPainterPath area;
     };
 
-    QPainterPath m_fill;
+    QFont m_font;
+    QString m_text;
+    mutable QPainterPath m_fill;
     mutable QPainterPath m_contour;
-    mutable bool m_contourMade = false;
+    mutable QList<QGlyphRun> m_runs;
     mutable std::vector<std::unique_ptr<Outline>> m_outlines;
+    mutable bool m_fillMade = false;
+    mutable bool m_contourMade = false;
+    mutable bool m_runsMade = false;
     bool m_hasPath = true;
 };
 

@@ -7,10 +7,12 @@
 #include <QAbstractTextDocumentLayout>
 #include <QApplication>
 #include <QPainter>
+#include <QPainterPathStroker>
 #include <QPalette>
 #include <QTextBlock>
 #include <QTextBoundaryFinder>
 #include <QTextCursor>
+#include <algorithm>
 
 namespace
 {
@@ -18,8 +20,15 @@ namespace
 constexpr double BaselineShare = 0.85;
 constexpr double CaretShift = 1.0;
 constexpr double FrameRadius = 1.0;
+// Pixels; the font system keeps pictures of smaller characters.
+constexpr int LargestBitmapGlyph = 64;
 const QColor SelectedFill(0, 128, 255, 77);
 const QColor EditFill(0, 0, 0, 77);
+
+bool isSpace(const QString& text)
+{
+    return std::all_of(text.begin(), text.end(), [](QChar c) { return c.isSpace(); });
+}
 } // namespace
 
 TextPainter::TextPainter(GraphicsText& item) : m_item(item), m_carets(*item.document())
@@ -35,23 +44,44 @@ void TextPainter::invalidate()
 void TextPainter::addGlyph(int position, const QString& text, const CaretGeometry::Caret& caret)
 {
     const TextStyle* style = m_item.styles().at(position);
-    if (!style)
+    if (!style || isSpace(text))
         return;
+    const QFont font = CharacterFormat::font(*style, m_item.canvasRatio());
     Glyph glyph;
-    glyph.font = CharacterFormat::font(*style, m_item.canvasRatio());
-    glyph.path = GlyphPathCache::glyph(glyph.font, text);
-    if (glyph.path->hasPath() && glyph.path->fill().isEmpty())
-        return;
+    glyph.path = GlyphPathCache::glyph(font, text);
     glyph.baseline = QPointF(caret.x - CaretShift, caret.top + BaselineShare * caret.height);
     glyph.color = CharacterFormat::color(style->getFontColor());
-    glyph.edge = style->isTextEdge() != 0;
+    glyph.edge = style->isTextEdge() != 0 && glyph.path->hasPath();
     if (glyph.edge) {
         glyph.edgeColor = CharacterFormat::color(style->textEdge().getEdgeColor());
         glyph.edgeWidth = CharacterFormat::outlineWidth(*style, m_item.canvasRatio());
     }
-    if (!glyph.path->hasPath())
-        glyph.text = text;
+    // An outline and its glyph must fit exactly; else the font system draws small characters best.
+    if (!glyph.path->hasPath() || (!glyph.edge && font.pixelSize() < LargestBitmapGlyph)) {
+        addRuns(glyph);
+        return;
+    }
+    m_steps.push_back({false, m_glyphs.size()});
     m_glyphs.push_back(std::move(glyph));
+}
+
+void TextPainter::addRuns(const Glyph& glyph)
+{
+    for (const QGlyphRun& source : glyph.path->runs()) {
+        QList<QPointF> positions = source.positions();
+        for (QPointF& position : positions)
+            position += glyph.baseline;
+        if (!m_steps.empty() && m_steps.back().isRun) {
+            PendingRun& last = m_pending.back();
+            if (last.color == glyph.color && last.font == source.rawFont()) {
+                last.indexes += source.glyphIndexes();
+                last.positions += positions;
+                continue;
+            }
+        }
+        m_steps.push_back({true, m_pending.size()});
+        m_pending.push_back({source.rawFont(), glyph.color, source.glyphIndexes(), positions});
+    }
 }
 
 void TextPainter::collectBlock(const QTextBlock& block)
@@ -79,16 +109,27 @@ void TextPainter::collectGlyphs()
     // Held until the new ones are made, so that a full cache does not make them again.
     const std::vector<Glyph> previous = std::move(m_glyphs);
     m_glyphs.clear();
-    m_glyphs.reserve(previous.size() + 1);
+    m_runs.clear();
+    m_steps.clear();
     for (QTextBlock block = m_item.document()->begin(); block.isValid(); block = block.next())
         collectBlock(block);
+    m_runs.reserve(m_pending.size());
+    for (const PendingRun& pending : m_pending) {
+        Run run;
+        run.color = pending.color;
+        run.glyphs.setRawFont(pending.font);
+        run.glyphs.setGlyphIndexes(pending.indexes);
+        run.glyphs.setPositions(pending.positions);
+        m_runs.push_back(std::move(run));
+    }
+    m_pending.clear();
     m_valid = true;
 }
 
 void TextPainter::drawItemTextOutLine(QPainter* painter, const QTransform& origin) const
 {
     for (const Glyph& glyph : m_glyphs) {
-        if (!glyph.edge || !glyph.path->hasPath())
+        if (!glyph.edge)
             continue;
         painter->setWorldTransform(QTransform(origin).translate(glyph.baseline.x(), glyph.baseline.y()));
         if (glyph.edgeWidth > 0) {
@@ -107,14 +148,16 @@ void TextPainter::drawItemText(QPainter* painter)
     const QTransform origin = painter->worldTransform();
     painter->setRenderHint(QPainter::Antialiasing);
     drawItemTextOutLine(painter, origin);
-    for (const Glyph& glyph : m_glyphs) {
-        painter->setWorldTransform(QTransform(origin).translate(glyph.baseline.x(), glyph.baseline.y()));
-        if (glyph.path->hasPath()) {
-            painter->fillPath(glyph.path->fill(), glyph.color);
+    for (const Step& step : m_steps) {
+        if (step.isRun) {
+            const Run& run = m_runs[step.index];
+            painter->setWorldTransform(origin);
+            painter->setPen(run.color);
+            painter->drawGlyphRun(QPointF(), run.glyphs);
         } else {
-            painter->setFont(glyph.font);
-            painter->setPen(glyph.color);
-            painter->drawText(QPointF(), glyph.text);
+            const Glyph& glyph = m_glyphs[step.index];
+            painter->setWorldTransform(QTransform(origin).translate(glyph.baseline.x(), glyph.baseline.y()));
+            painter->fillPath(glyph.path->fill(), glyph.color);
         }
     }
     painter->setWorldTransform(origin);
@@ -129,19 +172,31 @@ void TextPainter::drawItemBoundingRect(QPainter* painter)
     const int status = child->getBoundingLineStatus();
     if (status == FocusNone || (status == FocusEdit && child->getFocusFlag() != FocusEdit))
         return;
-    const QRectF frame = child->boundingRect();
+    prepareFrame(child->boundingRect());
+    painter->setRenderHint(QPainter::Antialiasing, false);
+    painter->fillRect(m_frame.rect, status == FocusObject ? SelectedFill : EditFill);
+    painter->setRenderHint(QPainter::Antialiasing);
     if (status == FocusObject) {
-        painter->setPen(QPen(QColor(ITEMBOUNDINGSOLIDCOLOR), ITEMBOUNDINGWIDTH, Qt::SolidLine));
-        painter->setBrush(SelectedFill);
-        painter->drawRoundedRect(frame, FrameRadius, FrameRadius);
+        painter->fillPath(m_frame.solid, QColor(ITEMBOUNDINGSOLIDCOLOR));
         return;
     }
-    painter->setPen(QPen(QColor(ITEMBOUNDINGDOTUPCOLOR), ITEMBOUNDINGWIDTH, Qt::SolidLine));
-    painter->setBrush(EditFill);
-    painter->drawRoundedRect(frame, FrameRadius, FrameRadius);
-    painter->setPen(QPen(QColor(ITEMBOUNDINGDOTDOWNCOLOR), ITEMBOUNDINGWIDTH, Qt::DotLine));
-    painter->setBrush(Qt::NoBrush);
-    painter->drawRoundedRect(frame, FrameRadius, FrameRadius);
+    painter->fillPath(m_frame.solid, QColor(ITEMBOUNDINGDOTUPCOLOR));
+    painter->fillPath(m_frame.dotted, QColor(ITEMBOUNDINGDOTDOWNCOLOR));
+}
+
+void TextPainter::prepareFrame(const QRectF& rect)
+{
+    if (m_frame.rect == rect)
+        return;
+    QPainterPath outline;
+    outline.addRoundedRect(rect, FrameRadius, FrameRadius);
+    const auto stroked = [&outline](Qt::PenStyle style) {
+        QPainterPath area =
+            QPainterPathStroker(QPen(Qt::black, ITEMBOUNDINGWIDTH, style)).createStroke(outline);
+        area.setFillRule(Qt::WindingFill);
+        return area;
+    };
+    m_frame = {rect, stroked(Qt::SolidLine), stroked(Qt::DotLine)};
 }
 
 void TextPainter::drawSelection(QPainter* painter)

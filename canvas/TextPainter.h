@@ -5,8 +5,10 @@
 #include "canvas/TextObjectConstants.h"
 
 #include <QColor>
-#include <QFont>
+#include <QGlyphRun>
+#include <QList>
 #include <QPointF>
+#include <QRawFont>
 #include <QString>
 #include <memory>
 #include <vector>
@@ -43,19 +45,46 @@ private:
         QColor edgeColor;
         int edgeWidth = 0;
         bool edge = false;
-        // For characters without an outline.
-        QFont font;
-        QString text;
+    };
+    // Small characters side by side that share font and colour, in item coordinates.
+    struct Run {
+        QGlyphRun glyphs;
+        QColor color;
+    };
+    // A run while it is collected.
+    struct PendingRun {
+        QRawFont font;
+        QColor color;
+        QList<quint32> indexes;
+        QList<QPointF> positions;
+    };
+    // What is drawn in reading order: a glyph of its own or a run, by index.
+    struct Step {
+        bool isRun;
+        size_t index;
+    };
+
+    // A frame as it is stroked; dots cost more to make than to fill.
+    struct Frame {
+        QRectF rect;
+        QPainterPath solid;
+        QPainterPath dotted;
     };
 
     void collectGlyphs();
+    void prepareFrame(const QRectF& rect);
     void collectBlock(const QTextBlock& block);
     void addGlyph(int position, const QString& text, const CaretGeometry::Caret& caret);
+    void addRuns(const Glyph& glyph);
     void drawItemTextOutLine(QPainter* painter, const QTransform& origin) const;
 
     GraphicsText& m_item;
     CaretGeometry m_carets;
     std::vector<Glyph> m_glyphs;
+    std::vector<Run> m_runs;
+    std::vector<PendingRun> m_pending;
+    std::vector<Step> m_steps;
     std::vector<CaretGeometry::Caret> m_blockCarets;
+    Frame m_frame;
     bool m_valid = false;
 };

@@ -12,6 +12,7 @@
 #include <QTextLayout>
 #include <QTextOption>
 #include <algorithm>
+#include <cmath>
 
 namespace
 {
@@ -240,6 +241,7 @@ void TextStyleEditor::charsRemovedChange(int position, int count)
     }
     if (emptied)
         setCaretHeight(*m_styles.lastAlpha().textItems().front());
+    finishLayout();
     updateWidthAndAlign(m_lastWidth);
     applyShadow();
 }
@@ -504,10 +506,10 @@ void TextStyleEditor::updateWidthAndAlign(double oldWidth)
 {
     const Guard guard(*this);
     m_item.announceGeometryChange();
-    m_item.setTextWidth(-1.0);
     adjustLeftAndRightMargin();
-    const double width = m_item.layoutRect().width();
-    m_item.setTextWidth(width);
+    const double width = naturalWidth();
+    if (m_item.textWidth() != width)
+        m_item.setTextWidth(width);
     setDocumentAlign(oldWidth, width);
     m_lastWidth = width;
     if (GraphicsText* parent = m_item.parentTextItem())
@@ -517,7 +519,30 @@ void TextStyleEditor::updateWidthAndAlign(double oldWidth)
     m_item.update();
 }
 
-bool TextStyleEditor::adjustLeftAndRightMargin()
+// The width that the document has without a text width. Lines never wrap, so they tell it whatever width is
+// set, and the document need not be laid out twice. Margins count in 64ths of a pixel, as the layout rounds
+// them.
+double TextStyleEditor::naturalWidth() const
+{
+    const auto rounded = [](double margin) { return std::floor(margin * 64.0) / 64.0; };
+    const QTextDocument& document = *m_item.document();
+    double widest = 0.0;
+    for (QTextBlock block = document.begin(); block.isValid(); block = block.next()) {
+        const QTextBlockFormat format = block.blockFormat();
+        const double margins = rounded(format.leftMargin()) + rounded(format.rightMargin());
+        for (int i = 0; i < block.layout()->lineCount(); ++i)
+            widest = std::max(widest, block.layout()->lineAt(i).naturalTextWidth() + margins);
+    }
+    return widest + 2.0 * rounded(document.documentMargin());
+}
+
+// While the document reports a removal it has not laid itself out yet; a change of width makes it do so.
+void TextStyleEditor::finishLayout()
+{
+    m_item.setTextWidth(-1.0);
+}
+
+void TextStyleEditor::adjustLeftAndRightMargin()
 {
     QTextDocument& document = *m_item.document();
     double tallest = 0.0;
@@ -529,7 +554,6 @@ bool TextStyleEditor::adjustLeftAndRightMargin()
     BOUNDING_RECT_EXPAND_REGION_FOR_HANDLE = BOUNDING_RECT_EXPAND_REGION / 2.0;
     const double margin = BOUNDING_RECT_EXPAND_REGION_FOR_HANDLE;
 
-    bool changed = false;
     QTextCursor cursor(&document);
     cursor.beginEditBlock();
     for (QTextBlock block = document.begin(); block.isValid(); block = block.next()) {
@@ -540,10 +564,8 @@ bool TextStyleEditor::adjustLeftAndRightMargin()
         format.setRightMargin(margin);
         cursor.setPosition(block.position());
         cursor.setBlockFormat(format);
-        changed = true;
     }
     cursor.endEditBlock();
-    return changed;
 }
 
 void TextStyleEditor::setDocumentAlign(double oldWidth, double width)

@@ -63,7 +63,9 @@ private:
     void changeSelectionPropertyWhenObjectIsEmpty(int id, const TText& source);
     void changeTextItemPosition(float x, float y);
     void updateWidthAndAlign(double oldWidth);
-    bool adjustLeftAndRightMargin();
+    double naturalWidth() const;
+    void finishLayout();
+    void adjustLeftAndRightMargin();
     void setDocumentAlign(double oldWidth, double width);
     void setCaretHeight(const TextStyle& style);
     void reportStyle(const TextStyle& style);
