@@ -7,13 +7,14 @@
 #include <QString>
 #include <array>
 #include <cmath>
+#include <functional>
 
 namespace
 {
 
 constexpr int CHARACTERS_A_WORD = 6;
 constexpr int CHARACTERS_A_LINE = 40;
-constexpr int FOLDER_TITLES = 99;
+constexpr int FIRST_NUMBER = 100; // of three digits
 constexpr int FOLDER_TITLE_CHARACTERS = 40;
 constexpr std::array COLORS = {"#FFFFFF", "#FFD24D", "#8FE3FF", "#FF6060"};
 constexpr std::u16string_view LETTERS = u"Breaking news from the coast 快讯速報 live at ten o'clock ";
@@ -57,7 +58,7 @@ std::unique_ptr<TText> BenchTitles::text(int id, float x, float y, const Look& l
     }
     std::string whole;
     std::vector<TextStyle*> items;
-    int letter = 0;
+    int letter = look.firstLetter;
     const auto add = [&](const QString& c) {
         auto style = std::make_unique<TextStyle>(styleOf(static_cast<int>(items.size()), look));
         style->setText(c.toStdString());
@@ -74,7 +75,7 @@ std::unique_ptr<TText> BenchTitles::text(int id, float x, float y, const Look& l
     return text;
 }
 
-Archive BenchTitles::title(const std::string& path, int characters, int size)
+Archive BenchTitles::title(const std::string& path, int characters, int size, int textCount)
 {
     Archive archive;
     const std::size_t slash = path.rfind('/');
@@ -88,22 +89,23 @@ Archive BenchTitles::title(const std::string& path, int characters, int size)
     archive.setThumbnailBlack(stem + "_240S.png");
     constexpr float LINE = 170;
     std::vector<TText*> texts;
-    for (int id = 1; id <= TEXTS; ++id) {
-        const Look look{characters, size, id == 1 ? 4 : 0, id == 2, true};
+    for (int id = 1; id <= textCount; ++id) {
+        const Look look{characters, size, id == 1 ? 4 : 0,
+                        id == 2,    true, static_cast<int>(std::hash<std::string>()(stem) % LETTERS.size())};
         texts.push_back(text(id, 20, 10 + LINE * static_cast<float>(id - 1), look).release());
     }
     archive.setText(std::move(texts));
     return archive;
 }
 
-std::vector<std::string> BenchTitles::writeFolder(const std::string& folder)
+std::vector<std::string> BenchTitles::writeFolder(const std::string& folder, int count, int texts)
 {
     TitleParser parser;
     std::vector<std::string> paths;
     std::vector<ArchiveOrder> rows;
-    for (int i = 0; i < FOLDER_TITLES; ++i) {
-        const std::string name = "202401010900000" + std::to_string(10 + i) + ".xml";
-        Archive archive = title(folder + '/' + name, FOLDER_TITLE_CHARACTERS, 48);
+    for (int i = 0; i < count; ++i) {
+        const std::string name = "20240101090000" + std::to_string(FIRST_NUMBER + i) + ".xml";
+        Archive archive = title(folder + '/' + name, FOLDER_TITLE_CHARACTERS, 48, texts);
         parser.writeOneTitle(&archive);
         ArchiveOrder row;
         row.setArchiveIndex(i);

@@ -24,14 +24,19 @@ PeerProcess::~PeerProcess()
 
 bool PeerProcess::startRole(const QString& role)
 {
-    mProcess.start(QStringLiteral("/proc/self/exe"), {role});
-    QByteArray line;
-    while (!line.endsWith('\n')) {
+    return startAndAwait(QStringLiteral("/proc/self/exe"), {role}, "ready\n");
+}
+
+bool PeerProcess::startAndAwait(const QString& program, const QStringList& arguments, const QByteArray& line)
+{
+    mProcess.start(program, arguments);
+    QByteArray read;
+    while (!read.endsWith('\n')) {
         if (!mProcess.waitForReadyRead(START_TIME))
             return false;
-        line += mProcess.readAllStandardOutput();
+        read += mProcess.readAllStandardOutput();
     }
-    return line == "ready\n";
+    return read == line;
 }
 
 bool PeerProcess::start(const QString& program, const QStringList& arguments)

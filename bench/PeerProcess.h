@@ -14,9 +14,10 @@ public:
     PeerProcess(const PeerProcess&) = delete;
     PeerProcess& operator=(const PeerProcess&) = delete;
 
-    // Starts this program in one of its other roles and waits for the line "ready". False when it does not
-    // come.
+    // Starts this program in one of its other roles and waits for the line "ready".
     bool startRole(const QString& role);
+    // Starts a program and waits for its first line. False when that does not come or is another one.
+    bool startAndAwait(const QString& program, const QStringList& arguments, const QByteArray& line);
     // Starts any program, its output discarded. False when it cannot be started.
     bool start(const QString& program, const QStringList& arguments = {});
     // Waits for the end of the process; whether it ended by itself with 0.

@@ -15,6 +15,7 @@ namespace
 
 constexpr double AIM = 1.3;
 constexpr int CHARACTERS = 300;
+constexpr int FOLDER_TITLES = 99;
 constexpr std::chrono::seconds SYNC_TIME(10);
 
 bool writeTitle(const std::string& path)
@@ -91,7 +92,7 @@ void Topics::addTitleFiles(PairList& list, const BenchEnvironment& environment)
         [one](benchmark::State& state) { loadAndSave(state, one + "/floor.xml"); });
 
     const std::string folder = environment.makeFolder(QStringLiteral("folder")).toStdString();
-    const std::vector<std::string> paths = BenchTitles::writeFolder(folder);
+    const std::vector<std::string> paths = BenchTitles::writeFolder(folder, FOLDER_TITLES);
     list.add(
         {"folder_load", AIM, PairList::Clock::Wall}, benchmark::kMillisecond,
         [folder, paths](benchmark::State& state) { readFolder(state, folder, paths.size()); },

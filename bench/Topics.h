@@ -10,6 +10,7 @@ namespace Topics
 void addMessaging(PairList& list);
 void addPictures(PairList& list, const BenchEnvironment& environment);
 void addRendering(PairList& list, const BenchEnvironment& environment);
+void addStart(PairList& list);
 void addTyping(PairList& list);
 void addTitleFiles(PairList& list, const BenchEnvironment& environment);
 

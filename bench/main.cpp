@@ -2,15 +2,21 @@
 //
 //   titler_bench                 all pairs, then their ratios
 //   titler_bench --strict        the same; the exit code is 1 when a pair misses its aim
-//   titler_bench --benchmark_... as any Google Benchmark program
+//   titler_bench --memory [N]    resident memory over N sessions (500) instead; takes a second or two for
+//   each titler_bench --benchmark_... as any Google Benchmark program
 #include "bench/BenchEnvironment.h"
+#include "bench/BenchTitles.h"
 #include "bench/CallPeer.h"
 #include "bench/PairReporter.h"
 #include "bench/Topics.h"
 
 #include <QApplication>
+#include <QFileInfo>
 #include <algorithm>
+#include <cstdio>
+#include <cstdlib>
 #include <cstring>
+#include <unistd.h>
 #include <vector>
 
 namespace
@@ -23,6 +29,22 @@ int runRole(const char* role, int argc, char* argv[])
         return RawPeer::run();
     CallPeer peer;
     return peer.run();
+}
+
+// The programs are driven by mouse and keys on a display, for which there is a script.
+int runMemory(const char* count)
+{
+    const QByteArray build = QFileInfo(BenchEnvironment::binaryFolder()).path().toLocal8Bit();
+    execlp("python3", "python3", "-B", TITLER_MEMORY_SCRIPT, build.constData(), count, nullptr);
+    std::perror("python3");
+    return 2;
+}
+
+int writeTitles(const char* folder, const char* count)
+{
+    constexpr int TEXTS = 3; // leaves room for one more
+    const int wanted = std::atoi(count);
+    return BenchTitles::writeFolder(folder, wanted, TEXTS).size() == static_cast<std::size_t>(wanted) ? 0 : 1;
 }
 
 bool takeOption(std::vector<char*>& arguments, const char* option)
@@ -51,6 +73,7 @@ int runPairs(std::vector<char*> arguments, const BenchEnvironment& environment)
     Topics::addTyping(list);
     Topics::addTitleFiles(list, environment);
     Topics::addMessaging(list);
+    Topics::addStart(list);
     PairReporter reporter(list);
     benchmark::RunSpecifiedBenchmarks(&reporter);
     benchmark::Shutdown();
@@ -63,6 +86,10 @@ int main(int argc, char* argv[])
 {
     if (argc == 2 && (std::strcmp(argv[1], "--raw-peer") == 0 || std::strcmp(argv[1], "--call-peer") == 0))
         return runRole(argv[1], argc, argv);
+    if (argc == 4 && std::strcmp(argv[1], "--write-titles") == 0)
+        return writeTitles(argv[2], argv[3]);
+    if (argc >= 2 && std::strcmp(argv[1], "--memory") == 0)
+        return runMemory(argc > 2 ? argv[2] : nullptr);
     const std::vector<char*> arguments(argv, argv + argc);
     const BenchEnvironment environment;
     if (!environment.isValid())
