@@ -88,24 +88,12 @@
 <context>
     <name>ArchiveList</name>
     <message>
-        <source>Create New</source>
-        <translation>新建</translation>
+        <source>Folder</source>
+        <translation>文件夹</translation>
     </message>
     <message>
-        <source>Copy</source>
-        <translation>复制</translation>
-    </message>
-    <message>
-        <source>Paste</source>
-        <translation>粘贴</translation>
-    </message>
-    <message>
-        <source>Delete</source>
-        <translation>删除</translation>
-    </message>
-    <message>
-        <source>Add User</source>
-        <translation>添加到用户模板</translation>
+        <source>File</source>
+        <translation>文件</translation>
     </message>
 </context>
 <context>
@@ -151,7 +139,7 @@
     </message>
     <message>
         <source>Copy</source>
-        <translation>拷贝</translation>
+        <translation>复制</translation>
     </message>
     <message>
         <source>Paste</source>
