@@ -1,6 +1,7 @@
 #include "canvas/TextObjectList.h"
 
 #include "canvas/GraphicsText.h"
+#include "canvas/TextStyleEditor.h"
 #include "document/TText.h"
 
 #include <QGraphicsScene>
@@ -130,6 +131,7 @@ void TextObjectList::clearSelectionMode()
 void TextObjectList::hide(GraphicsText* item)
 {
     m_listed.removeAll(item);
+    item->styleEditor().discardBurst();
     GraphicsText* parent = item->parentTextItem();
     if (!parent)
         return;

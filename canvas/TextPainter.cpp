@@ -25,6 +25,15 @@ constexpr int LargestBitmapGlyph = 64;
 const QColor SelectedFill(0, 128, 255, 77);
 const QColor EditFill(0, 0, 0, 77);
 
+// What the painter's device shows, in the painter's coordinates.
+QRectF visibleArea(const QPainter& painter)
+{
+    bool invertible = false;
+    const QTransform back = painter.combinedTransform().inverted(&invertible);
+    const QRectF device(0.0, 0.0, painter.device()->width(), painter.device()->height());
+    return invertible ? back.mapRect(device) : QRectF();
+}
+
 bool isSpace(const QString& text)
 {
     return std::all_of(text.begin(), text.end(), [](QChar c) { return c.isSpace(); });
@@ -56,16 +65,19 @@ void TextPainter::addGlyph(int position, const QString& text, const CaretGeometr
         glyph.edgeColor = CharacterFormat::color(style->textEdge().getEdgeColor());
         glyph.edgeWidth = CharacterFormat::outlineWidth(*style, m_item.canvasRatio());
     }
+    // No glyph of a usable font reaches farther than this from its baseline.
+    const double extent = 2.0 * font.pixelSize() * double(text.size()) + glyph.edgeWidth;
+    const QRectF reach(glyph.baseline - QPointF(extent, extent), QSizeF(2.0 * extent, 2.0 * extent));
     // An outline and its glyph must fit exactly; else the font system draws small characters best.
     if (!glyph.path->hasPath() || (!glyph.edge && font.pixelSize() < LargestBitmapGlyph)) {
-        addRuns(glyph);
+        addRuns(glyph, reach);
         return;
     }
-    m_steps.push_back({false, m_glyphs.size()});
+    m_steps.push_back({false, m_glyphs.size(), reach});
     m_glyphs.push_back(std::move(glyph));
 }
 
-void TextPainter::addRuns(const Glyph& glyph)
+void TextPainter::addRuns(const Glyph& glyph, const QRectF& reach)
 {
     for (const QGlyphRun& source : glyph.path->runs()) {
         QList<QPointF> positions = source.positions();
@@ -76,10 +88,11 @@ void TextPainter::addRuns(const Glyph& glyph)
             if (last.color == glyph.color && last.font == source.rawFont()) {
                 last.indexes += source.glyphIndexes();
                 last.positions += positions;
+                m_steps.back().reach |= reach;
                 continue;
             }
         }
-        m_steps.push_back({true, m_pending.size()});
+        m_steps.push_back({true, m_pending.size(), reach});
         m_pending.push_back({source.rawFont(), glyph.color, source.glyphIndexes(), positions});
     }
 }
@@ -126,11 +139,13 @@ void TextPainter::collectGlyphs()
     m_valid = true;
 }
 
-void TextPainter::drawItemTextOutLine(QPainter* painter, const QTransform& origin) const
+void TextPainter::drawItemTextOutLine(QPainter* painter, const QTransform& origin,
+                                      const QRectF& visible) const
 {
-    for (const Glyph& glyph : m_glyphs) {
-        if (!glyph.edge)
+    for (const Step& step : m_steps) {
+        if (step.isRun || !m_glyphs[step.index].edge || !visible.intersects(step.reach))
             continue;
+        const Glyph& glyph = m_glyphs[step.index];
         painter->setWorldTransform(QTransform(origin).translate(glyph.baseline.x(), glyph.baseline.y()));
         if (glyph.edgeWidth > 0) {
             painter->fillPath(glyph.path->outline(glyph.edgeWidth), glyph.edgeColor);
@@ -147,8 +162,11 @@ void TextPainter::drawItemText(QPainter* painter)
     const bool antialiasing = painter->testRenderHint(QPainter::Antialiasing);
     const QTransform origin = painter->worldTransform();
     painter->setRenderHint(QPainter::Antialiasing);
-    drawItemTextOutLine(painter, origin);
+    const QRectF visible = visibleArea(*painter);
+    drawItemTextOutLine(painter, origin, visible);
     for (const Step& step : m_steps) {
+        if (!visible.intersects(step.reach))
+            continue;
         if (step.isRun) {
             const Run& run = m_runs[step.index];
             painter->setWorldTransform(origin);
@@ -181,7 +199,10 @@ void TextPainter::drawItemBoundingRect(QPainter* painter)
         return;
     }
     painter->fillPath(m_frame.solid, QColor(ITEMBOUNDINGDOTUPCOLOR));
-    painter->fillPath(m_frame.dotted, QColor(ITEMBOUNDINGDOTDOWNCOLOR));
+    painter->setRenderHint(QPainter::Antialiasing, false);
+    painter->setPen(Qt::NoPen);
+    painter->setBrush(QColor(ITEMBOUNDINGDOTDOWNCOLOR));
+    painter->drawRects(m_frame.dots);
 }
 
 void TextPainter::prepareFrame(const QRectF& rect)
@@ -190,13 +211,23 @@ void TextPainter::prepareFrame(const QRectF& rect)
         return;
     QPainterPath outline;
     outline.addRoundedRect(rect, FrameRadius, FrameRadius);
-    const auto stroked = [&outline](Qt::PenStyle style) {
-        QPainterPath area =
-            QPainterPathStroker(QPen(Qt::black, ITEMBOUNDINGWIDTH, style)).createStroke(outline);
-        area.setFillRule(Qt::WindingFill);
-        return area;
-    };
-    m_frame = {rect, stroked(Qt::SolidLine), stroked(Qt::DotLine)};
+    m_frame.rect = rect;
+    m_frame.solid = QPainterPathStroker(QPen(Qt::black, ITEMBOUNDINGWIDTH)).createStroke(outline);
+    m_frame.solid.setFillRule(Qt::WindingFill);
+
+    // A dotted pen with square caps: dots of two pen widths, one apart.
+    constexpr double pen = ITEMBOUNDINGWIDTH;
+    m_frame.dots.clear();
+    for (double x = rect.left(); x < rect.right(); x += 3.0 * pen) {
+        const double length = std::min(2.0 * pen, rect.right() + pen - x);
+        for (const double y : {rect.top(), rect.bottom()})
+            m_frame.dots.append(QRectF(x - pen / 2.0, y - pen / 2.0, length, pen));
+    }
+    for (double y = rect.top(); y < rect.bottom(); y += 3.0 * pen) {
+        const double length = std::min(2.0 * pen, rect.bottom() + pen - y);
+        for (const double x : {rect.left(), rect.right()})
+            m_frame.dots.append(QRectF(x - pen / 2.0, y - pen / 2.0, pen, length));
+    }
 }
 
 void TextPainter::drawSelection(QPainter* painter)

@@ -43,6 +43,8 @@ public:
     // Typing up to now becomes an undo step.
     void pushLastEditTextIntoStack();
     void undoTimeOut();
+    // Forgets typing that has not become a step: the object is going away.
+    void discardBurst() { m_undoTimer.stop(); }
 
 private:
     class Guard;

@@ -492,6 +492,9 @@ int TouchTextEditor::getSelectionModel(const QTextCursor& word, int position)
 
 void TouchTextEditor::longPressed()
 {
+    // Editing may have ended under the finger.
+    if (m_item.getFocusFlag() != FocusEdit || !m_item.isEnabled())
+        return;
     m_state.longPressed = true;
     setNearestCurPos();
     QTextCursor cursor = m_item.textCursor();

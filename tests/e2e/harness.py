@@ -66,6 +66,8 @@ class TitlerTest(unittest.TestCase):
     """A test case with a running appliance and titler."""
 
     samples = None
+    # Characters to be typed that an ordinary keyboard has not.
+    extra_keys = ""
     titler_arguments = ()
     environment_changes = {}
 
@@ -86,6 +88,7 @@ class TitlerTest(unittest.TestCase):
         self.base = self.provision()
         self.display = session.Display(os.path.join(self.work, "x"), self.environment)
         self.addCleanup(self.display.stop)
+        self.display.add_keys(self.extra_keys)
         self.environment = self.display.environment
         self.start_programs()
 
