@@ -183,7 +183,7 @@ class Display:
         return tuple(int(values[key]) for key in ("X", "Y", "WIDTH", "HEIGHT"))
 
     def click(self, x, y, button=1):
-        self.xdotool("mousemove", "--sync", x, y, "click", button)
+        self.xdotool("mousemove", x, y, "click", button)
 
     def grab(self):
         """The screen as (width, height, RGB bytes)."""

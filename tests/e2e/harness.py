@@ -7,6 +7,7 @@ import atexit
 import json
 import os
 import shutil
+import socket
 import subprocess
 import sys
 import tempfile
@@ -20,7 +21,6 @@ sys.path.insert(0, os.path.join(os.path.dirname(os.path.dirname(HERE)), "scripts
 import session  # noqa: E402  pylint: disable=wrong-import-position
 
 BUILD = os.environ.get("TITLER_BUILD", os.path.join(session.ROOT, "build"))
-OFFSET = int(os.environ.get("TITLER_TEST_OFFSET", "21000"))
 # Sanitizers make everything slower, never wrong.
 SLOW = 4 if os.path.basename(BUILD).endswith("asan") else 1
 
@@ -38,6 +38,20 @@ def pngdiff(*arguments):
     if done.returncode != 0:
         raise session.SessionError(f"titler_pngdiff {arguments}: {done.stderr.strip()}")
     return json.loads(done.stdout)
+
+
+def free_port_offset():
+    """An offset at which all ports are free. It starts at a place of this process: several suites can run at once."""
+    offsets = [20000 + 10 * ((os.getpid() + number) % 1000) for number in range(1000)]
+    for offset in offsets:
+        try:
+            for port in (session.MAIN_PORT, session.SUB_PANEL_PORT, session.TITLER_PORT):
+                with socket.socket() as probe:
+                    probe.bind(("127.0.0.1", port + offset))
+        except OSError:
+            continue
+        return offset
+    raise session.SessionError("no free ports")
 
 
 class Title:
@@ -78,9 +92,10 @@ class TitlerTest(unittest.TestCase):
         # The platform's buffers for paths are short, so the data path is, too.
         self.work = tempfile.mkdtemp(prefix="titler-")
         self.addCleanup(shutil.rmtree, self.work, ignore_errors=True)
+        self.offset = free_port_offset()
         self.environment = session.program_environment(
             BUILD, K2SYS_AC_ROOT="", K2SYS_AC_DATA=os.path.join(self.work, "d"), K2SYS_LOG_DIR=self.keep,
-            K2SYS_PORT_OFFSET=OFFSET, **self.environment_changes)
+            K2SYS_PORT_OFFSET=self.offset, **self.environment_changes)
         self.display = None
         self.appliance = None
         self.titler = None
@@ -108,8 +123,8 @@ class TitlerTest(unittest.TestCase):
     def start_programs(self):
         self.appliance = session.Appliance(BUILD, os.path.join(self.keep, "appliance.log"), self.environment)
         self.addCleanup(self.appliance.stop)
-        session.wait_listening(self.appliance, session.MAIN_PORT + OFFSET, 30 * SLOW)
-        session.wait_listening(self.appliance, session.SUB_PANEL_PORT + OFFSET, 30 * SLOW)
+        session.wait_listening(self.appliance, session.MAIN_PORT + self.offset, 30 * SLOW)
+        session.wait_listening(self.appliance, session.SUB_PANEL_PORT + self.offset, 30 * SLOW)
         self.start_titler()
 
     def start_titler(self):
@@ -117,7 +132,7 @@ class TitlerTest(unittest.TestCase):
         self.titler = session.start_titler(BUILD, os.path.join(self.keep, "titler.log"), self.environment,
                                            self.titler_arguments)
         self.addCleanup(self.titler.stop)
-        session.wait_listening(self.titler, session.TITLER_PORT + OFFSET, 60 * SLOW)
+        session.wait_listening(self.titler, session.TITLER_PORT + self.offset, 60 * SLOW)
         self.command("wait-titler")
         # The last service that a titler registers at: from here on every notice reaches it.
         self.wait_call("APPEventFilter", "registerNotify", start, 60)
