@@ -305,15 +305,22 @@ class TitlerTest(unittest.TestCase):
             with self.subTest(picture=suffix):
                 self.assertEqual(pngdiff("size", title.picture(suffix)), {"width": width, "height": height})
 
-    def assert_no_leftovers(self, folder):
-        """Nothing but titles, their pictures and the order lies in the folder."""
+    def leftovers(self, folder):
+        """What lies in the folder besides titles, their pictures and the order."""
         known = {".order.xml"}
         for title in self.titles(folder):
             stem = os.path.basename(title.stem)
             known.add(stem + ".xml")
             known.update(stem + suffix for suffix in PICTURES)
             known.update(stem + suffix for suffix in ("_source_1280.png", "_source_1920.png"))
-        self.assertEqual(set(os.listdir(folder)) - known, set())
+        return set(os.listdir(folder)) - known
+
+    def assert_no_leftovers(self, folder):
+        self.assertEqual(self.leftovers(folder), set())
+
+    def wait_no_leftovers(self, folder, timeout=20):
+        """Waits until the versions that are kept while a save is on its way to the disk are gone."""
+        session.wait_until(lambda: not self.leftovers(folder), timeout * SLOW, f"nothing left over in {folder}")
 
     def wait_text(self, title, wanted, timeout=20):
         """Waits until the file holds a text object with this text."""
