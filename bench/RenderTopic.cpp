@@ -24,6 +24,9 @@ constexpr double REPAINT_AIM = 1.3;
 constexpr double BIG_POSITION = 1.5;       // from the 1280 canvas to the 1920 raster
 constexpr double TITLE_PIXELS_OFF = 0.002; // share of pixels in which the two drawings may differ
 constexpr unsigned long POLL = 50;         // microseconds
+// Large enough that the program draws every character as a path.
+constexpr int CHARACTERS = 24;
+constexpr int SIZE = 96;
 const QSize CANVAS(1280, 720);
 
 // One text as paths, and its shadow.
@@ -240,7 +243,7 @@ void repaintPaths(benchmark::State& state)
 void Topics::addRendering(PairList& list, const BenchEnvironment& environment)
 {
     const std::string folder = environment.makeFolder(QStringLiteral("rendering")).toStdString();
-    const Archive archive = BenchTitles::title(folder + "/title.xml", 40, 60);
+    const Archive archive = BenchTitles::title(folder + "/title.xml", CHARACTERS, SIZE);
     list.add(
         {"slow_pass_drawing", SLOW_PASS_AIM, PairList::Clock::Cpu}, benchmark::kMillisecond,
         [archive](benchmark::State& state) { slowPass(state, archive); },

@@ -15,7 +15,11 @@ constexpr int HEIGHT = 1080;
 class BareWindow : public QWidget
 {
 public:
-    explicit BareWindow(bool stay) : mStay(stay) { resize(WIDTH, HEIGHT); }
+    explicit BareWindow(bool stay) : mStay(stay)
+    {
+        setWindowTitle(QStringLiteral("bare_window"));
+        resize(WIDTH, HEIGHT);
+    }
 
 protected:
     void paintEvent(QPaintEvent*) override

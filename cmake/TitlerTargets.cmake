@@ -7,9 +7,12 @@ if(TITLER_WERROR)
     target_compile_options(titler_options INTERFACE -Werror)
 endif()
 if(TITLER_SANITIZE)
-    target_compile_options(titler_options INTERFACE -fsanitize=address,undefined -fno-sanitize-recover=undefined
+    # Casts of floating numbers are no part of "undefined", and the checks of the containers belong to the library.
+    set(TITLER_SANITIZERS address,undefined,float-cast-overflow)
+    target_compile_options(titler_options INTERFACE -fsanitize=${TITLER_SANITIZERS} -fno-sanitize-recover=all
                                                     -fno-omit-frame-pointer)
-    target_link_options(titler_options INTERFACE -fsanitize=address,undefined)
+    target_compile_definitions(titler_options INTERFACE _GLIBCXX_ASSERTIONS)
+    target_link_options(titler_options INTERFACE -fsanitize=${TITLER_SANITIZERS})
 endif()
 
 # titler_add_library(NAME SOURCES... ) makes the static library of one source folder.
@@ -36,9 +39,27 @@ set(TITLER_TEST_ENVIRONMENT
     XDG_RUNTIME_DIR=${TITLER_TEST_DIR}/xdg/runtime
     FONTCONFIG_FILE=${TITLER_FONTS_CONF}
     K2SYS_LOG_DIR=${TITLER_TEST_DIR}/log
-    ASAN_OPTIONS=detect_leaks=1
+    ASAN_OPTIONS=exitcode=86:detect_leaks=1:detect_stack_use_after_return=1:strict_string_checks=1
     LSAN_OPTIONS=suppressions=${CMAKE_SOURCE_DIR}/cmake/lsan.supp:print_suppressions=0
-    UBSAN_OPTIONS=print_stacktrace=1)
+    UBSAN_OPTIONS=print_stacktrace=1:halt_on_error=1)
+
+# Sanitizers make everything slower, so the time limits of the tests grow by this factor.
+if(TITLER_SANITIZE)
+    set(TITLER_TEST_TIME_FACTOR 5 CACHE STRING "Factor on the time limits of the tests")
+else()
+    set(TITLER_TEST_TIME_FACTOR 1 CACHE STRING "Factor on the time limits of the tests")
+endif()
+
+# titler_set_test(NAME SECONDS VARIABLE=VALUE... ) gives a registered test what every test has: its time limit, the
+# environment above with the changes given, and failure by whatever a sanitizer says, also in a child process that the
+# test itself would not notice.
+function(titler_set_test name seconds)
+    math(EXPR limit "${seconds} * ${TITLER_TEST_TIME_FACTOR}")
+    set_tests_properties(${name} PROPERTIES
+        TIMEOUT ${limit}
+        ENVIRONMENT "${TITLER_TEST_ENVIRONMENT};${ARGN}"
+        FAIL_REGULAR_EXPRESSION "ERROR: [A-Za-z]*Sanitizer;WARNING: [A-Za-z]*Sanitizer;runtime error:")
+endfunction()
 
 # titler_add_test(NAME LIBS... ) builds tests/<folder>/NAME.cpp as one QtTest program and registers it.
 # Tests run without a display unless they say otherwise.
@@ -48,7 +69,5 @@ function(titler_add_test name)
     set_target_properties(${name} PROPERTIES RUNTIME_OUTPUT_DIRECTORY ${TITLER_TEST_DIR})
     add_dependencies(${name} titler_fonts)
     add_test(NAME ${name} COMMAND ${name})
-    set_tests_properties(${name} PROPERTIES
-        TIMEOUT 120
-        ENVIRONMENT "QT_QPA_PLATFORM=offscreen;${TITLER_TEST_ENVIRONMENT}")
+    titler_set_test(${name} 120 QT_QPA_PLATFORM=offscreen)
 endfunction()

@@ -66,6 +66,7 @@ class Process:
 
     def __init__(self, arguments, log, environment=None, **options):
         self.log = log
+        self.killed = False
         self.name = os.path.basename(arguments[0])
         with open(log, "ab") as stream:
             options.setdefault("stdin", subprocess.DEVNULL)
@@ -83,6 +84,7 @@ class Process:
 
     def signal(self, number):
         if self.running():
+            self.killed = self.killed or number == signal.SIGKILL
             self.popen.send_signal(number)
 
     def wait(self, timeout):
@@ -183,7 +185,7 @@ class Display:
         return tuple(int(values[key]) for key in ("X", "Y", "WIDTH", "HEIGHT"))
 
     def click(self, x, y, button=1):
-        self.xdotool("mousemove", "--sync", x, y, "click", button)
+        self.xdotool("mousemove", x, y, "click", button)
 
     def grab(self):
         """The screen as (width, height, RGB bytes)."""

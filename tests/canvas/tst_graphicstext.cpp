@@ -4,7 +4,6 @@
 #include "canvas/StyleDocument.h"
 #include "canvas/TextPainter.h"
 
-#include <QMimeData>
 #include <QClipboard>
 #include <QGraphicsDropShadowEffect>
 #include <QGraphicsScene>

@@ -6,7 +6,9 @@ logs and the picture differences stay under tests/e2e/ in the build tree.
 import atexit
 import json
 import os
+import re
 import shutil
+import socket
 import subprocess
 import sys
 import tempfile
@@ -20,9 +22,10 @@ sys.path.insert(0, os.path.join(os.path.dirname(os.path.dirname(HERE)), "scripts
 import session  # noqa: E402  pylint: disable=wrong-import-position
 
 BUILD = os.environ.get("TITLER_BUILD", os.path.join(session.ROOT, "build"))
-OFFSET = int(os.environ.get("TITLER_TEST_OFFSET", "21000"))
 # Sanitizers make everything slower, never wrong.
 SLOW = 4 if os.path.basename(BUILD).endswith("asan") else 1
+
+SANITIZER_REPORT = re.compile(r"ERROR: \w*Sanitizer|WARNING: \w*Sanitizer|runtime error:")
 
 # Where things are in the window, in its own pixels.
 CANVAS = (609, 97, 1280, 720)
@@ -38,6 +41,20 @@ def pngdiff(*arguments):
     if done.returncode != 0:
         raise session.SessionError(f"titler_pngdiff {arguments}: {done.stderr.strip()}")
     return json.loads(done.stdout)
+
+
+def free_port_offset():
+    """An offset at which all ports are free. It starts at a place of this process: several suites can run at once."""
+    offsets = [20000 + 10 * ((os.getpid() + number) % 1000) for number in range(1000)]
+    for offset in offsets:
+        try:
+            for port in (session.MAIN_PORT, session.SUB_PANEL_PORT, session.TITLER_PORT):
+                with socket.socket() as probe:
+                    probe.bind(("127.0.0.1", port + offset))
+        except OSError:
+            continue
+        return offset
+    raise session.SessionError("no free ports")
 
 
 class Title:
@@ -78,12 +95,14 @@ class TitlerTest(unittest.TestCase):
         # The platform's buffers for paths are short, so the data path is, too.
         self.work = tempfile.mkdtemp(prefix="titler-")
         self.addCleanup(shutil.rmtree, self.work, ignore_errors=True)
+        self.offset = free_port_offset()
         self.environment = session.program_environment(
             BUILD, K2SYS_AC_ROOT="", K2SYS_AC_DATA=os.path.join(self.work, "d"), K2SYS_LOG_DIR=self.keep,
-            K2SYS_PORT_OFFSET=OFFSET, **self.environment_changes)
+            K2SYS_PORT_OFFSET=self.offset, **self.environment_changes)
         self.display = None
         self.appliance = None
         self.titler = None
+        self.programs = []
         self.copied = False
         self.base = self.provision()
         self.display = session.Display(os.path.join(self.work, "x"), self.environment)
@@ -108,8 +127,9 @@ class TitlerTest(unittest.TestCase):
     def start_programs(self):
         self.appliance = session.Appliance(BUILD, os.path.join(self.keep, "appliance.log"), self.environment)
         self.addCleanup(self.appliance.stop)
-        session.wait_listening(self.appliance, session.MAIN_PORT + OFFSET, 30 * SLOW)
-        session.wait_listening(self.appliance, session.SUB_PANEL_PORT + OFFSET, 30 * SLOW)
+        self.programs.append(self.appliance)
+        session.wait_listening(self.appliance, session.MAIN_PORT + self.offset, 30 * SLOW)
+        session.wait_listening(self.appliance, session.SUB_PANEL_PORT + self.offset, 30 * SLOW)
         self.start_titler()
 
     def start_titler(self):
@@ -117,7 +137,8 @@ class TitlerTest(unittest.TestCase):
         self.titler = session.start_titler(BUILD, os.path.join(self.keep, "titler.log"), self.environment,
                                            self.titler_arguments)
         self.addCleanup(self.titler.stop)
-        session.wait_listening(self.titler, session.TITLER_PORT + OFFSET, 60 * SLOW)
+        self.programs.append(self.titler)
+        session.wait_listening(self.titler, session.TITLER_PORT + self.offset, 60 * SLOW)
         self.command("wait-titler")
         # The last service that a titler registers at: from here on every notice reaches it.
         self.wait_call("APPEventFilter", "registerNotify", start, 60)
@@ -125,10 +146,30 @@ class TitlerTest(unittest.TestCase):
     def tearDown(self):
         outcome = self._outcome.result
         failed = any(test is self for test, _ in outcome.errors + outcome.failures)
-        if not failed and sys.exc_info()[0] is None and self._outcome.success:
-            shutil.rmtree(self.keep, ignore_errors=True)
-        elif self.display:
+        passed = not failed and sys.exc_info()[0] is None and self._outcome.success
+        if not passed and self.display:
             self.display.screenshot(os.path.join(self.keep, "failed.png"))
+        ends = self.end_programs()
+        reports = self.sanitizer_reports()
+        self.assertEqual(reports, "")
+        if passed:
+            self.assertEqual(set(ends) - {0}, set(), f"exit codes {ends}, see {self.keep}")
+            shutil.rmtree(self.keep, ignore_errors=True)
+
+    def end_programs(self):
+        """Ends what runs, the titler first, and gives the exit codes: leaks are only looked for at an orderly end."""
+        return [program.stop(30 * SLOW) for program in reversed(self.programs) if not program.killed]
+
+    def sanitizer_reports(self):
+        """What the sanitizers had to say about the programs of this test."""
+        reports = []
+        for program in self.programs:
+            with open(program.log, encoding="utf-8", errors="replace") as stream:
+                text = stream.read()
+            found = SANITIZER_REPORT.search(text)
+            if found:
+                reports.append(text[text.rfind("\n", 0, found.start()) + 1:][:20000])
+        return "\n".join(reports)
 
     def command(self, line):
         """Gives the appliance a command and waits until it has been carried out."""
