@@ -39,7 +39,7 @@ set(TITLER_TEST_ENVIRONMENT
     XDG_RUNTIME_DIR=${TITLER_TEST_DIR}/xdg/runtime
     FONTCONFIG_FILE=${TITLER_FONTS_CONF}
     K2SYS_LOG_DIR=${TITLER_TEST_DIR}/log
-    ASAN_OPTIONS=exitcode=86:detect_leaks=1:detect_stack_use_after_return=1:strict_string_checks=1
+    ASAN_OPTIONS=exitcode=86:detect_leaks=1:detect_stack_use_after_return=1
     LSAN_OPTIONS=suppressions=${CMAKE_SOURCE_DIR}/cmake/lsan.supp:print_suppressions=0
     UBSAN_OPTIONS=print_stacktrace=1:halt_on_error=1)
 
