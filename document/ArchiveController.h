@@ -63,6 +63,8 @@ public:
                                                 std::vector<std::string> targets);
 
 private:
+    QList<Archive*> readableArchives(const std::string& folder);
+
     ArchiveManager* mArchiveManager; // shared, not owned
     std::vector<ArchiveOrder*> mFileOrder;
 };

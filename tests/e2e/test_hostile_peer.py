@@ -37,7 +37,7 @@ class HostilePeer(harness.TitlerTest):
         return self.rng.randbytes(size).translate(bytes.maketrans(b"./", b"xx"))
 
     def connect(self):
-        connection = wire.Connection()
+        connection = wire.Connection(self.offset)
         self.connections.append(connection)
         return connection
 
@@ -114,6 +114,19 @@ class HostilePeer(harness.TitlerTest):
         self.hide()
         self.assert_unharmed()
 
+    def test_texts_without_an_end(self):
+        connection = self.connect()
+        for text in (b"", b"\xff\xfe\xfd", b"\xed\xa0\x80", b"\xf8\x88\x80\x80\x80", b"\xf4\x90\x80\x80", b"\xc3",
+                     self.folder("gone").encode() + b"/gone.xml", b"\x01\x02/../\n", b"x" * 20000):
+            connection.call(wire.SHOW_EDIT, wire.pack_int(0) + wire.pack_raw(text))
+        self.wait_handled(connection)
+        self.hide()
+        # Where the text ends with its bytes, it is still a text.
+        connection.call(wire.SHOW_EDIT, wire.pack_int(0) + wire.pack_raw(self.title.path.encode()))
+        self.wait_shown()
+        self.assert_canvas_shows(self.title, mean=1.0, visible=0.01)
+        self.assert_unharmed()
+
     def callback_payloads(self):
         text = wire.pack_wide("速報")
         whole = wire.pack_int32(6) + wire.pack_int32(65) + wire.pack_int32(0) + text + b"\0" + wire.pack_int32(30)
@@ -157,6 +170,49 @@ class HostilePeer(harness.TitlerTest):
         # The order to end is obeyed whatever its payload says.
         connection.call(1, self.rng.randbytes(100), target=self.power_adapter, callback=1)
         self.assertEqual(self.titler.wait(30 * harness.SLOW), 0)
+
+    def test_silent_and_dying_peers(self):
+        silent = [self.connect() for _ in range(3)]
+        part = wire.frame(wire.SHOW_EDIT, wire.pack_int(0) + wire.pack_wide(self.title.path))
+        for length in (1, 7, 8, 55, 56, 57, 4096, wire.FRAME_SIZE - 1):
+            dying = self.connect()
+            dying.send(part[:length])
+            dying.wait_acknowledgement()
+            dying.close()
+        # One that sends and closes at once, and one that stays in the middle of a frame.
+        sudden = self.connect()
+        sudden.send(part[:30])
+        sudden.close()
+        waiting = self.connect()
+        waiting.send(part[:10000])
+        waiting.wait_acknowledgement()
+        self.assertIsNone(self.window(), "a part of a request is no request")
+        self.assert_unharmed()
+        # The rest of the frame is still welcome, however late, and so is what the silent ones have to say.
+        waiting.send(part[10000:])
+        self.wait_shown()
+        self.hide()
+        silent[1].call(wire.SHOW_EDIT, wire.pack_int(0) + wire.pack_wide(self.title.path))
+        self.wait_shown()
+        self.assert_unharmed()
+
+    def test_forty_connections_at_once(self):
+        # At most two are accepted a second, and ten wait; who is not let in tries again.
+        for _ in range(40):
+            connection = self.connect()
+            connection.send(wire.frame(wire.SHOW_EDIT, self.rng.randbytes(500))[:self.rng.randrange(1, 20480)])
+        # The appliance's own connection is served meanwhile.
+        self.open_title(self.title)
+        self.close_window()
+        last = self.connections[-1]
+        last.timeout = 60 * harness.SLOW
+        last.wait_acknowledgement()
+        for connection in self.connections:
+            connection.close()
+        self.connections.clear()
+        fresh = self.connect()
+        self.wait_handled(fresh)
+        self.assert_unharmed()
 
     def test_a_flood_is_held_up_and_not_kept(self):
         connection = self.connect()

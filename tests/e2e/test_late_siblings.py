@@ -15,7 +15,7 @@ class LateSiblings(harness.TitlerTest):
         self.titler = harness.session.start_titler(harness.BUILD, os.path.join(self.keep, "titler.log"),
                                                    self.environment)
         self.addCleanup(self.titler.stop)
-        harness.session.wait_listening(self.titler, wire.PORT, 60 * harness.SLOW)
+        harness.session.wait_listening(self.titler, harness.session.TITLER_PORT + self.offset, 60 * harness.SLOW)
 
     def start_appliance(self):
         self.appliance = harness.session.Appliance(harness.BUILD, os.path.join(self.keep, "appliance.log"),
@@ -26,7 +26,7 @@ class LateSiblings(harness.TitlerTest):
         # The titler listens before its siblings do, and waits for them with its interface built and hidden.
         self.start_titler_alone()
         title = self.titles(self.folder())[0]
-        early = wire.Connection()
+        early = wire.Connection(self.offset)
         self.addCleanup(early.close)
         early.call(wire.SHOW_EDIT, wire.pack_int(0) + wire.pack_wide(title.path))
         early.wait_acknowledgement()
@@ -56,7 +56,7 @@ class LateSiblings(harness.TitlerTest):
         self.click_tool("Close")
         self.wait_hidden()
         self.titler.check()
-        early = wire.Connection()
+        early = wire.Connection(self.offset)
         self.addCleanup(early.close)
         early.call(wire.SHOW_EDIT, wire.pack_int(0) + wire.pack_wide(title.path))
         self.wait_shown()

@@ -18,7 +18,6 @@ HEADER_SIZE = peer.HEADER.size
 MAX_PAYLOAD = FRAME_SIZE - HEADER_SIZE
 TITLER_OBJECT = 117
 SHOW_CREATE, SHOW_EDIT, DIALOG_MASK, MESSAGE_MASK, REGISTER = 1, 2, 3, 4, 5
-PORT = peer.TITLER_PORT + harness.OFFSET
 
 pack_int = peer.pack_int
 pack_raw = peer.pack_raw
@@ -35,9 +34,9 @@ def frame(method, payload, receiver=peer.TITLER_RECEIVER, target=TITLER_OBJECT, 
 class Connection:
     """A connection to the titler. Acknowledgements are read and counted, but never waited for."""
 
-    def __init__(self, timeout=20):
+    def __init__(self, offset, timeout=20):
         self.timeout = timeout * harness.SLOW
-        self.socket = socket.create_connection(("127.0.0.1", PORT), self.timeout)
+        self.socket = socket.create_connection(("127.0.0.1", peer.TITLER_PORT + offset), self.timeout)
         self.acknowledged = 0
 
     def _drain(self):
