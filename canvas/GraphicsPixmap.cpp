@@ -1,9 +1,22 @@
 #include "canvas/GraphicsPixmap.h"
 
+#include <QFileInfo>
 #include <QPainter>
 
+namespace
+{
+
+// Opening a pipe waits until somebody writes to it, and a device may never end.
+QPixmap readPicture(const QString& path)
+{
+    const QFileInfo info(path);
+    return info.exists() && !info.isFile() ? QPixmap() : QPixmap(path);
+}
+
+} // namespace
+
 GraphicsPixmap::GraphicsPixmap(const QString& path, QGraphicsItem* parent)
-    : QGraphicsPixmapItem(QPixmap(path), parent), m_path(path)
+    : QGraphicsPixmapItem(readPicture(path), parent), m_path(path)
 {
     setFlag(ItemIsMovable, false);
     setFlag(ItemIsSelectable, true);

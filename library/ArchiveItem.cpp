@@ -4,6 +4,7 @@
 #include "document/TText.h"
 
 #include <QBrush>
+#include <QFileInfo>
 #include <QFontMetrics>
 #include <QGraphicsPixmapItem>
 #include <QGraphicsScene>
@@ -141,7 +142,7 @@ void ArchiveItem::updateLeftChild(QImage image)
         return;
     if (image.isNull()) {
         const QString path = mArchive->getFullPathOfThumbnailSmall();
-        if (!path.isEmpty())
+        if (QFileInfo(path).isFile()) // a pipe would be waited for
             image = QImageReader(path).read();
     }
     mPixmapItem->setPixmap(image.isNull() ? QPixmap() : QPixmap::fromImage(image));
