@@ -68,11 +68,143 @@ class TitleFolders(harness.TitlerTest):
         before = wire.snapshot(folder)
         start = self.appliance.mark()
         self.command(f'edit "{path}"')
-        self.wait_shown()
+        # The window shows and has read the folder.
+        self.wait_call("FileManagerController", "titlerEditStatus", start)
+        harness.session.wait_until(self.window, 20 * harness.SLOW, "the window")
         messages = self.posted_messages(start)
         self.close_window()
         self.assertEqual(wire.snapshot(folder), before)
         return messages
+
+    def test_torn_and_oversized_title_files(self):
+        rng = random.Random(20261121)
+
+        def contents(good):
+            yield b""
+            for _ in range(8):
+                yield good[:rng.randrange(1, len(good))]
+            yield good + b" " * (MAX_FILE + 1 - len(good))
+            yield good.replace(b"Evening", b"\xff\xfe\xc0Evening", 1)
+            yield good.replace(b"Evening", b"\xed\xa0\x80", 1)
+            yield rng.randbytes(20000)
+            yield b"\0" * 5000
+
+        folder, paths = self.variants("torn", contents)
+        for path in (folder, paths[1], paths[4], paths[10], paths[-1]):
+            with self.subTest(path=path):
+                self.open_and_close(path)
+        # The damaged ones are not in the list: the second row is the last file.
+        self.command(f'edit "{paths[-1]}"')
+        self.wait_shown()
+        self.assert_canvas_shows(harness.Title(paths[0]), mean=1.0, visible=0.01)
+
+    def test_deep_files_and_many_attributes(self):
+        def contents(good):
+            for depth in (NEST, NEST + 10, 50000):
+                yield good.replace(b"</manifest>", b"<a>" * (depth - 1) + b"</a>" * (depth - 1) + b"</manifest>")
+            yield good.replace(b"<manifest ", b"<manifest " + b"".join(b'a%d="1" ' % i for i in range(300)), 1)
+            yield good.replace(b"<manifest ", b"<manifest " + b"".join(b'a%d="1" ' % i for i in range(200)), 1)
+            yield good.replace(b'content-count="', b'content-count="99999999', 1)
+            yield re.sub(rb'item-count="\d+"', b'item-count="-2147483648"', good)
+            yield re.sub(rb'size="\d+"', b'size="999999999999"', good)
+            yield re.sub(rb'position-([XY])="[^"]*"', rb'position-\1="-1e30"', good)
+            yield re.sub(rb'edge-width="\d+"', b'edge-width="2000000000"', good)
+            yield re.sub(rb'shadow-blur-radius="\d+"', b'shadow-blur-radius="2000000000"',
+                         good.replace(b'text-shadow="0"', b'text-shadow="1"'))
+
+        folder, paths = self.variants("deep", contents)
+        for path in (folder, *paths):
+            with self.subTest(path=path):
+                self.open_and_close(path)
+
+    def test_unreadable_pictures(self):
+        path = self.copied_title("pictures")
+        folder = os.path.dirname(path)
+        stem = path[:-len(".xml")]
+        damages = {
+            "missing": lambda name: os.remove(name),
+            "truncated": lambda name: write(name, read(name)[:len(read(name)) // 2]),
+            "noise": lambda name: write(name, random.Random(1).randbytes(5000)),
+            "empty": lambda name: write(name, b""),
+            "folder": lambda name: (os.remove(name), os.mkdir(name)),
+            "link to itself": lambda name: (os.remove(name), os.symlink(os.path.basename(name), name)),
+            "pipe": lambda name: (os.remove(name), os.mkfifo(name)),
+            # A header that claims more pixels than there is memory.
+            "giant": lambda name: write(name, read(name)[:16] + b"\x7f\xff\xff\xff" * 2 + read(name)[24:]),
+        }
+        names = [os.path.basename(stem) + suffix
+                 for suffix in ("_240.png", "_1920.png", "_source_1280.png", "_source_1920.png")]
+        kept = {name: read(os.path.join(folder, name)) for name in names}
+        for kind, damage in damages.items():
+            with self.subTest(damage=kind):
+                for name in names:
+                    damage(os.path.join(folder, name))
+                start = self.appliance.mark()
+                self.command(f'edit "{path}"')
+                self.wait_call("FileManagerController", "titlerEditStatus", start)
+                harness.session.wait_until(self.window, 20 * harness.SLOW, "the window")
+                self.close_unsaved()
+                for name, data in kept.items():
+                    target = os.path.join(folder, name)
+                    if os.path.isdir(target):
+                        os.rmdir(target)
+                    elif os.path.lexists(target):
+                        os.remove(target)
+                    write(target, data)
+        self.open_title(harness.Title(path))
+        self.assert_canvas_shows(harness.Title(path), mean=1.0, visible=0.01)
+
+    def test_nonsense_in_the_order_file(self):
+        path = self.copied_title("order")
+        folder = os.path.dirname(path)
+        name = os.path.basename(path)
+        row = f'<index value="0" file-path="{name}" />'
+        # Each names as many titles as there are, so that the clean-up takes the folder to be in step.
+        for rows in (f'<index value="x" file-path="a.xml" />{row}', f'<what /><index file-path="b.xml" />{row}',
+                     f'{row}<index value="-7" file-path="../../../gone.xml" />',
+                     f'{row}<index value="1" file-path="" /><index value="2" file-path="abc" />',
+                     f'{row}<index value="1" file-path=".." /><index value="1" file-path="&#1;&#xFFFF;" />',
+                     row * 300):
+            with self.subTest(rows=rows[:90]):
+                write(os.path.join(folder, ".order.xml"), f'<manifest type="order">{rows}</manifest>'.encode())
+                self.open_and_close(path)
+
+    def test_an_unreadable_order_file_is_an_empty_list(self):
+        path = self.copied_title("unordered")
+        folder = os.path.dirname(path)
+        other = os.path.join(folder, "notes.txt")
+        write(other, b"not a title")
+        for order in (b"", b"\xff\xff", b"<manifest><index", b"<a>" * 70000, read(path)[:300]):
+            with self.subTest(order=order[:20]):
+                write(os.path.join(folder, ".order.xml"), order)
+                start = self.appliance.mark()
+                self.command(f'edit "{folder}"')
+                self.wait_shown()
+                # With nothing in the list a new title is begun, and the order is written anew with it.
+                self.close_window()
+                self.assertEqual(self.posted_messages(start), [])
+                self.assertEqual(len(self.titles(folder)), 1)
+                self.assertEqual(wire.broken_files(folder), {})
+        self.assertEqual(read(other), b"not a title")
+
+    def test_names_of_all_scripts(self):
+        for name in ("Größe é", "新闻 快讯", "ニュース速報", "뉴스 속보", "e\u0301a\u0308 combining",
+                     "\U0001F600 \U0001F1EF\U0001F1F5"):
+            with self.subTest(name=name):
+                path = self.copied_title(name)
+                folder = os.path.dirname(path)
+                title = os.path.join(folder, name + " 1.xml")
+                os.rename(path, title)
+                self.write_order(folder, [os.path.basename(title)])
+                start = self.appliance.mark()
+                self.open_title(harness.Title(title))
+                self.click_tool("New Text")
+                self.wait_keyboard(start)
+                self.command(f"string {name}")
+                self.display.wait_until_still()
+                self.close_window()
+                self.assertEqual(harness.Title(title).texts()[-1], name)
+                self.assertEqual(wire.broken_files(folder), {})
 
     def test_a_missing_font_is_told_once_the_window_shows(self):
         path = self.copied_title("font")
