@@ -65,6 +65,8 @@ ArchiveController::ArchiveController() : mArchiveManager(ArchiveManager::getInst
 {
 }
 
+ArchiveController::~ArchiveController() = default;
+
 QList<std::string> ArchiveController::getFolderList()
 {
     const std::vector<std::string> folders = mArchiveManager->getArchiveFolderList();
@@ -147,6 +149,8 @@ bool ArchiveController::saveArchiveListOrder(QString folder, QList<ArchiveOrder*
 std::vector<ArchiveOrder*> ArchiveController::getFileOrder(QString folder)
 {
     mFileOrder = mArchiveManager->getArchivesSortUnderFolder(folder.toStdString());
+    for (ArchiveOrder* row : mFileOrder)
+        mFetchedRows.emplace_back(row);
     return mFileOrder;
 }
 

@@ -346,7 +346,6 @@ private slots:
         QCOMPARE(controller.getDeletedFileList(
                      {"/f/a.xml", "/f/c.xml", "/f/.order.xml", "/f/D.XML", "/f/e.xml.bak"}, {"/f/a.xml"}),
                  std::vector<std::string>({"/f/c.xml", "/f/D.XML"}));
-        qDeleteAll(rows);
     }
 
     void copiesPictures()
