@@ -82,6 +82,7 @@ void TestToolsBar::initTestCase()
     Q_INIT_RESOURCE(TitlerToolResource);
     Q_INIT_RESOURCE(UILibrary);
     m_device = QTest::createTouchDevice();
+    m_device->setParent(this);
     APPEventFilter::instance();
 }
 

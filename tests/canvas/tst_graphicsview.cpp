@@ -66,6 +66,7 @@ private:
 void tst_graphicsview::initTestCase()
 {
     m_device = QTest::createTouchDevice();
+    m_device->setParent(this);
 }
 
 void tst_graphicsview::init()

@@ -257,7 +257,8 @@ class TitlerTest(unittest.TestCase):
         return [event for event in self.appliance.since(start) if event.get("event") == "callback"]
 
     def type_keys(self, text):
-        self.display.xdotool("type", "--clearmodifiers", "--delay", "40", text)
+        # A character that no key has gets one for the length of the delay; it is lost when the titler looks later.
+        self.display.xdotool("type", "--clearmodifiers", "--delay", 40 * SLOW, text)
 
     def screenshot(self, name="screen.png"):
         path = os.path.join(self.keep, name)

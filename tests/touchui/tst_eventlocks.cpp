@@ -114,6 +114,7 @@ private:
 void TestEventLocks::initTestCase()
 {
     m_device = QTest::createTouchDevice();
+    m_device->setParent(this);
 }
 
 void TestEventLocks::init()

@@ -98,6 +98,7 @@ void TestTouchButtons::initTestCase()
 {
     Q_INIT_RESOURCE(TitlerToolResource);
     m_device = QTest::createTouchDevice();
+    m_device->setParent(this);
 }
 
 void TestTouchButtons::init()
