@@ -1,6 +1,6 @@
 #include "app/APPEventFilter.h"
 
-#include "touchui/ITitlerAPPEventFilterController.h"
+#include "app/TitlerAPPEventFilterController.h"
 #include "touchui/KSEventProcessLockObject.h"
 
 #include <QCoreApplication>
@@ -42,17 +42,13 @@ KSLockObject* APPEventFilter::processLock()
     if (KSEventProcessLockObject::s_instance == nullptr) {
         auto* lock = new KSEventProcessLockObject(this);
         KSEventProcessLockObject::s_instance = lock;
-        ITitlerAPPEventFilterController* controller = ITitlerAPPEventFilterController::getInstance();
-        if (controller != nullptr) {
-            connect(controller, &ITitlerAPPEventFilterController::signalSendAPPEvent, lock,
-                    &KSEventProcessLockObject::slotGetAppEvent, Qt::DirectConnection);
-        }
+        TitlerAPPEventFilterController* controller = TitlerAPPEventFilterController::getInstance();
+        connect(controller, &ITitlerAPPEventFilterController::signalSendAPPEvent, lock,
+                &KSEventProcessLockObject::slotGetAppEvent, Qt::DirectConnection);
         connect(this, &KSAppEventFilter::signalEventBegin, lock,
                 &KSEventProcessLockObject::slotRestoreOriginal, Qt::DirectConnection);
-        if (controller != nullptr) {
-            connect(controller, &ITitlerAPPEventFilterController::signalRestoreOriginal, lock,
-                    &KSEventProcessLockObject::slotRestoreAll);
-        }
+        connect(controller, &ITitlerAPPEventFilterController::signalRestoreOriginal, lock,
+                &KSEventProcessLockObject::slotRestoreAll);
     }
     return KSEventProcessLockObject::s_instance;
 }

@@ -8,8 +8,8 @@ class APPEventFilter : public KSAppEventFilter
 {
     Q_OBJECT
 public:
-    // Made at the first call and installed on the application; null without an application. The controller of
-    // the touch locks must have been installed before (ITitlerAPPEventFilterController::setInstance).
+    // Made at the first call, with the controller of the touch locks, and installed on the application; null
+    // without an application.
     static APPEventFilter* instance();
     // Takes it off the application and deletes it.
     static void release();

@@ -20,6 +20,7 @@ namespace
 
 constexpr std::string_view USER_TEMPLATE_PREFIX = "UserTemplate_";
 constexpr std::size_t NUMBER_LENGTH = 3;
+constexpr std::size_t XML_EXTENSION_LENGTH = 4;
 constexpr int LARGEST_NUMBER = 999;
 constexpr std::size_t MOST_NUMBERS = 997;
 
@@ -64,22 +65,47 @@ ArchiveController::ArchiveController() : mArchiveManager(ArchiveManager::getInst
 {
 }
 
+ArchiveController::~ArchiveController() = default;
+
 QList<std::string> ArchiveController::getFolderList()
 {
     const std::vector<std::string> folders = mArchiveManager->getArchiveFolderList();
     return QList<std::string>(folders.begin(), folders.end());
 }
 
+// Row by row, without those that are too short for the name of a title. The others must not be lost with
+// them: what the list does not show, the clean-up deletes.
+QList<Archive*> ArchiveController::readableArchives(const std::string& folder)
+{
+    const std::vector<ArchiveOrder*> rows = mArchiveManager->getArchivesSortUnderFolder(folder);
+    const std::vector<std::unique_ptr<ArchiveOrder>> owner(rows.begin(), rows.end());
+    QList<Archive*> titles;
+    for (std::size_t k = 0; k < rows.size(); ++k) {
+        auto archive = std::make_unique<Archive>();
+        const std::string& name = rows[k]->getArchivePath();
+        if (!name.empty()) {
+            if (name.size() < XML_EXTENSION_LENGTH ||
+                mArchiveManager->loadArchive(folder + STR_SLASH + name, archive.get()) < 1)
+                continue;
+            archive->setName(name.substr(0, name.size() - XML_EXTENSION_LENGTH));
+            archive->setOrder(std::to_string(k + 1));
+        }
+        titles.append(archive.release());
+    }
+    return titles;
+}
+
 QList<Archive*> ArchiveController::getArchiveList(QString folder)
 {
     if (folder.isEmpty())
         return {};
+    const std::string path = folder.toStdString();
     try {
-        const std::vector<Archive*> titles = mArchiveManager->getArchivesUnderFolder(folder.toStdString());
+        const std::vector<Archive*> titles = mArchiveManager->getArchivesUnderFolder(path);
         return QList<Archive*>(titles.begin(), titles.end());
     } catch (const std::out_of_range&) {
         qWarning() << "The order file names what cannot be a title:" << folder;
-        return {};
+        return readableArchives(path);
     }
 }
 
@@ -123,6 +149,8 @@ bool ArchiveController::saveArchiveListOrder(QString folder, QList<ArchiveOrder*
 std::vector<ArchiveOrder*> ArchiveController::getFileOrder(QString folder)
 {
     mFileOrder = mArchiveManager->getArchivesSortUnderFolder(folder.toStdString());
+    for (ArchiveOrder* row : mFileOrder)
+        mFetchedRows.emplace_back(row);
     return mFileOrder;
 }
 

@@ -5,6 +5,7 @@
 
 #include <QList>
 #include <QString>
+#include <memory>
 #include <string>
 #include <vector>
 
@@ -16,6 +17,9 @@ class ArchiveController
 {
 public:
     ArchiveController();
+    ~ArchiveController();
+    ArchiveController(const ArchiveController&) = delete;
+    ArchiveController& operator=(const ArchiveController&) = delete;
 
     // Full paths of the title folders.
     QList<std::string> getFolderList();
@@ -31,7 +35,8 @@ public:
     bool deleteArchive(QString path);
     bool saveArchiveListOrder(QString folder, QList<ArchiveOrder*> rows);
 
-    // The rows of a folder's order file. No one frees them: they stay valid for as long as any caller wants.
+    // The rows of a folder's order file. They stay valid as long as this controller, however often it is
+    // asked.
     std::vector<ArchiveOrder*> getFileOrder(QString folder);
 
     QString getLastArchivePath();
@@ -63,6 +68,9 @@ public:
                                                 std::vector<std::string> targets);
 
 private:
-    ArchiveManager* mArchiveManager; // shared, not owned
-    std::vector<ArchiveOrder*> mFileOrder;
+    QList<Archive*> readableArchives(const std::string& folder);
+
+    ArchiveManager* mArchiveManager;       // shared, not owned
+    std::vector<ArchiveOrder*> mFileOrder; // the rows last fetched
+    std::vector<std::unique_ptr<ArchiveOrder>> mFetchedRows;
 };

@@ -5,6 +5,7 @@
 #include <QFileInfo>
 #include <QImageWriter>
 #include <QtEndian>
+#include <algorithm>
 #include <cstring>
 #include <libdeflate.h>
 #include <memory>
@@ -33,43 +34,55 @@ void appendChunk(QByteArray& bytes, const char* type, const char* data, qsizetyp
     bytes.append(number, 4);
 }
 
-// The colour bytes of a line in the order of the file.
-void fillLine(const QRgb* pixels, int width, bool hasAlpha, unsigned char* line)
+// Lines whose colours are brought into the order of the file at a time: few enough to stay in the cache.
+constexpr int STRIP_LINES = 16;
+
+QImage stripInFileOrder(const QImage& image, int top)
 {
-    if (hasAlpha) {
-        for (int x = 0; x < width; ++x) {
-            const QRgb p = pixels[x];
-            const quint32 bytes =
-                qToLittleEndian((p & 0xFF00FF00u) | ((p >> 16) & 0xFFu) | ((p & 0xFFu) << 16));
-            std::memcpy(line + 4 * x, &bytes, 4);
-        }
-        return;
+    const int lines = std::min(STRIP_LINES, image.height() - top);
+    const QImage strip(image.constScanLine(top), image.width(), lines, image.bytesPerLine(), image.format());
+    if (!image.hasAlphaChannel())
+        return strip.convertToFormat(QImage::Format_RGB888);
+    return strip.convertToFormat(QImage::Format_ARGB32).convertToFormat(QImage::Format_RGBA8888);
+}
+
+// Differences of bytes, eight at a time. Their top bits are handled apart, so that no byte borrows from the
+// next.
+void subtract(const uchar* line, const uchar* above, uchar* out, std::size_t size)
+{
+    constexpr quint64 TOP_BITS = 0x8080808080808080;
+    std::size_t i = 0;
+    for (; i + sizeof(quint64) <= size; i += sizeof(quint64)) {
+        quint64 a = 0;
+        quint64 b = 0;
+        std::memcpy(&a, line + i, sizeof a);
+        std::memcpy(&b, above + i, sizeof b);
+        const quint64 difference = ((a | TOP_BITS) - (b & ~TOP_BITS)) ^ ((a ^ ~b) & TOP_BITS);
+        std::memcpy(out + i, &difference, sizeof difference);
     }
-    for (int x = 0; x < width; ++x) {
-        const QRgb p = pixels[x];
-        line[3 * x] = static_cast<unsigned char>(p >> 16);
-        line[3 * x + 1] = static_cast<unsigned char>(p >> 8);
-        line[3 * x + 2] = static_cast<unsigned char>(p);
-    }
+    for (; i < size; ++i)
+        out[i] = static_cast<uchar>(line[i] - above[i]);
 }
 
 // All lines as differences to the line above: titles have large areas of one colour, which become zeros.
-std::unique_ptr<unsigned char[]> filteredLines(const QImage& image, std::size_t lineSize)
+std::unique_ptr<uchar[]> filteredLines(const QImage& image, std::size_t lineSize)
 {
-    const bool hasAlpha = image.hasAlphaChannel();
     const auto height = static_cast<std::size_t>(image.height());
-    auto filtered = std::make_unique_for_overwrite<unsigned char[]>((lineSize + 1) * height);
-    const auto lines = std::make_unique<unsigned char[]>(2 * lineSize);
-    unsigned char* current = lines.get();
-    unsigned char* above = current + lineSize;
-    unsigned char* out = filtered.get();
-    for (int y = 0; y < image.height(); ++y) {
-        fillLine(reinterpret_cast<const QRgb*>(image.constScanLine(y)), image.width(), hasAlpha, current);
-        *out++ = FILTER_UP;
-        for (std::size_t i = 0; i < lineSize; ++i)
-            out[i] = static_cast<unsigned char>(current[i] - above[i]);
-        out += lineSize;
-        std::swap(current, above);
+    auto filtered = std::make_unique_for_overwrite<uchar[]>((lineSize + 1) * height);
+    const auto blank = std::make_unique<uchar[]>(lineSize);
+    const uchar* above = blank.get();
+    uchar* out = filtered.get();
+    QImage previous; // holds the line above the first of a strip
+    for (int top = 0; top < image.height(); top += STRIP_LINES) {
+        const QImage strip = stripInFileOrder(image, top);
+        for (int y = 0; y < strip.height(); ++y) {
+            const uchar* line = strip.constScanLine(y);
+            *out++ = FILTER_UP;
+            subtract(line, above, out, lineSize);
+            out += lineSize;
+            above = line;
+        }
+        previous = strip;
     }
     return filtered;
 }
@@ -132,9 +145,8 @@ QByteArray PngWriter::encode(const QImage& image)
     switch (image.format()) {
     case QImage::Format_RGB32:
     case QImage::Format_ARGB32:
-        return encode32(image);
     case QImage::Format_ARGB32_Premultiplied:
-        return encode32(image.convertToFormat(QImage::Format_ARGB32));
+        return encode32(image);
     default:
         return encodeByQt(image, "png");
     }

@@ -57,9 +57,44 @@ void setDouble(TiXmlElement* element, const char* key, double value)
     element->SetAttribute(key, TitleParserUtility::fromDouble(value).c_str());
 }
 
+// Length of the character at index that XML has no way to write, 0 for all others: control characters, and
+// U+FFFE and U+FFFF.
+std::size_t unwritableAt(std::string_view text, std::size_t index)
+{
+    const auto c = static_cast<unsigned char>(text[index]);
+    if (c < 0x20)
+        return c == '\t' || c == '\n' || c == '\r' ? 0 : 1;
+    const bool isNonCharacter = c == 0xEF && index + 2 < text.size() && text[index + 1] == '\xBF' &&
+                                static_cast<unsigned char>(text[index + 2]) >= 0xBE;
+    return isNonCharacter ? 3 : 0;
+}
+
+// A keyboard may send any character. One that XML cannot hold would make the file unreadable for all other
+// processes; a replacement character keeps the count of characters.
+std::string writable(const std::string& text)
+{
+    static constexpr std::string_view REPLACEMENT = "\xEF\xBF\xBD";
+    std::string result;
+    for (std::size_t i = 0; i < text.size();) {
+        const std::size_t length = unwritableAt(text, i);
+        result.append(length == 0 ? std::string_view(text).substr(i, 1) : REPLACEMENT);
+        i += length == 0 ? 1 : length;
+    }
+    return result;
+}
+
+bool isWritable(std::string_view text)
+{
+    for (std::size_t i = 0; i < text.size(); ++i) {
+        if (unwritableAt(text, i) != 0)
+            return false;
+    }
+    return true;
+}
+
 void setText(TiXmlElement* element, const char* key, const std::string& value)
 {
-    element->SetAttribute(key, value.c_str());
+    element->SetAttribute(key, isWritable(value) ? value.c_str() : writable(value).c_str());
 }
 
 } // namespace

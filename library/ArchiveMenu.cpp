@@ -2,6 +2,11 @@
 
 ArchiveMenu::ArchiveMenu(QWidget* parent) : QMenu(parent)
 {
+    setStyleSheet(QStringLiteral(
+        "QMenu { background-color: rgb(50, 50, 50); border: 1px solid rgb(102, 102, 102); padding: 6px; }"
+        "QMenu::item { color: rgb(220, 220, 220); padding: 12px 28px; min-width: 250px; }"
+        "QMenu::item:disabled { color: rgb(102, 102, 102); }"
+        "QMenu::item:selected:enabled { background-color: rgb(0, 129, 255); }"));
     for (ArchiveAction::ARCHIVE_ACTION_TYPE type :
          {ArchiveAction::ACTION_CREATE, ArchiveAction::ACTION_COPY, ArchiveAction::ACTION_PASTE,
           ArchiveAction::ACTION_DELETE, ArchiveAction::ACTION_ADD_USER}) {

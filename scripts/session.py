@@ -152,6 +152,25 @@ class Display:
             raise SessionError(f"xdotool {' '.join(map(str, arguments))}: {done.stderr.strip()}")
         return done.stdout
 
+    def add_keys(self, characters):
+        """Puts characters that no key has on spare keys. Before the programs start: a program that is busy while the
+        keyboard changes takes a key for what it is by then."""
+        old = subprocess.run(["xkbcomp", "-xkb", self.name, "-"], env=self.environment, capture_output=True, text=True,
+                             check=True).stdout
+        spare = [f"<FK{number}>" for number in range(13, 25)]
+        if len(characters) > len(spare):
+            raise SessionError(f"there are only {len(spare)} spare keys")
+        lines = "".join(f"    replace key {key} {{ type = \"ONE_LEVEL\", [ U{ord(character):04X} ] }};\n"
+                        for key, character in zip(spare, characters))
+        head, brace, tail = old.partition("xkb_symbols ")
+        name, opening, rest = tail.partition("{\n")
+        end = rest.index("\n};")
+        new = head + brace + name + opening + rest[:end] + "\n" + lines + rest[end + 1:]
+        done = subprocess.run(["xkbcomp", "-w", "0", "-", self.name], env=self.environment, input=new, text=True,
+                              capture_output=True, check=False)
+        if done.returncode != 0:
+            raise SessionError(f"xkbcomp: {done.stderr.strip()}")
+
     def find_window(self, title):
         """The id of the visible window with exactly this title, or None."""
         done = subprocess.run(["xdotool", "search", "--onlyvisible", "--name", f"^{re.escape(title)}$"],
@@ -166,7 +185,7 @@ class Display:
         return tuple(int(values[key]) for key in ("X", "Y", "WIDTH", "HEIGHT"))
 
     def click(self, x, y, button=1):
-        self.xdotool("mousemove", "--sync", x, y, "click", button)
+        self.xdotool("mousemove", x, y, "click", button)
 
     def grab(self):
         """The screen as (width, height, RGB bytes)."""

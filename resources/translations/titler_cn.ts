@@ -88,24 +88,12 @@
 <context>
     <name>ArchiveList</name>
     <message>
-        <source>Create New</source>
-        <translation>新建</translation>
+        <source>Folder</source>
+        <translation>文件夹</translation>
     </message>
     <message>
-        <source>Copy</source>
-        <translation>复制</translation>
-    </message>
-    <message>
-        <source>Paste</source>
-        <translation>粘贴</translation>
-    </message>
-    <message>
-        <source>Delete</source>
-        <translation>删除</translation>
-    </message>
-    <message>
-        <source>Add User</source>
-        <translation>添加到用户模板</translation>
+        <source>File</source>
+        <translation>文件</translation>
     </message>
 </context>
 <context>
@@ -141,6 +129,29 @@
     <message>
         <source>Cancel</source>
         <translation>取消</translation>
+    </message>
+</context>
+<context>
+    <name>ArchiveMenu</name>
+    <message>
+        <source>Create New</source>
+        <translation>新建</translation>
+    </message>
+    <message>
+        <source>Copy</source>
+        <translation>复制</translation>
+    </message>
+    <message>
+        <source>Paste</source>
+        <translation>粘贴</translation>
+    </message>
+    <message>
+        <source>Delete</source>
+        <translation>删除</translation>
+    </message>
+    <message>
+        <source>Save as Template</source>
+        <translation>存为模板</translation>
     </message>
 </context>
 </TS>

@@ -88,24 +88,12 @@
 <context>
     <name>ArchiveList</name>
     <message>
-        <source>Create New</source>
-        <translation>Create New</translation>
+        <source>Folder</source>
+        <translation>Folder</translation>
     </message>
     <message>
-        <source>Copy</source>
-        <translation>Copy</translation>
-    </message>
-    <message>
-        <source>Paste</source>
-        <translation>Paste</translation>
-    </message>
-    <message>
-        <source>Delete</source>
-        <translation>Delete</translation>
-    </message>
-    <message>
-        <source>Add User</source>
-        <translation>Add User</translation>
+        <source>File</source>
+        <translation>File</translation>
     </message>
 </context>
 <context>
@@ -141,6 +129,29 @@
     <message>
         <source>Cancel</source>
         <translation>Cancel</translation>
+    </message>
+</context>
+<context>
+    <name>ArchiveMenu</name>
+    <message>
+        <source>Create New</source>
+        <translation>Create New</translation>
+    </message>
+    <message>
+        <source>Copy</source>
+        <translation>Copy</translation>
+    </message>
+    <message>
+        <source>Paste</source>
+        <translation>Paste</translation>
+    </message>
+    <message>
+        <source>Delete</source>
+        <translation>Delete</translation>
+    </message>
+    <message>
+        <source>Save as Template</source>
+        <translation>Save as Template</translation>
     </message>
 </context>
 </TS>

@@ -317,6 +317,14 @@ private slots:
         qDeleteAll(titles);
         setOrder({"a.x"});
         QVERIFY(controller.getArchiveList(mFolder).isEmpty());
+        // A row that cannot be a title does not take the others with it.
+        setOrder({"a.x", "a.xml", ""});
+        const QList<Archive*> others = controller.getArchiveList(mFolder);
+        QCOMPARE(others.size(), 2);
+        QCOMPARE(others[0]->getName(), std::string("a"));
+        QCOMPARE(others[0]->getOrder(), std::string("2"));
+        QVERIFY(others[1]->getPath().empty());
+        qDeleteAll(others);
     }
 
     void orderRows()
@@ -338,7 +346,6 @@ private slots:
         QCOMPARE(controller.getDeletedFileList(
                      {"/f/a.xml", "/f/c.xml", "/f/.order.xml", "/f/D.XML", "/f/e.xml.bak"}, {"/f/a.xml"}),
                  std::vector<std::string>({"/f/c.xml", "/f/D.XML"}));
-        qDeleteAll(rows);
     }
 
     void copiesPictures()

@@ -10,6 +10,7 @@
 #include <QElapsedTimer>
 #include <QFile>
 #include <QTemporaryDir>
+#include <QXmlStreamReader>
 #include <QtTest/QTest>
 #include <clocale>
 #include <memory>
@@ -295,6 +296,29 @@ private slots:
         Archive loaded;
         QCOMPARE(mParser.readOneTitle(path("t.xml"), &loaded), 1);
         QCOMPARE(loaded.getText()[0]->getTextShadow()->getShadowBlurRadius(), 18.3);
+    }
+
+    // XML has no form for control characters; strict readers would refuse the whole title.
+    void charactersThatXmlCannotHoldAreReplaced()
+    {
+        Archive archive;
+        archive.setPath(path("t.xml"));
+        auto* text = new TText;
+        text->setText("a\x01\x1F\xEF\xBF\xBE\xEF\xBF\xBF\xEF\xBF\xBD\t\nz");
+        auto* style = new TextStyle;
+        style->setText("\x08");
+        text->setTextItems({style});
+        archive.setText({text});
+        QCOMPARE(mParser.writeOneTitle(&archive), 1);
+
+        QXmlStreamReader strict(read("t.xml"));
+        while (!strict.atEnd())
+            strict.readNext();
+        QVERIFY2(!strict.hasError(), qPrintable(strict.errorString()));
+        Archive loaded;
+        QCOMPARE(mParser.readOneTitle(path("t.xml"), &loaded), 1);
+        QCOMPARE(loaded.getText()[0]->getText(), std::string("a\uFFFD\uFFFD\uFFFD\uFFFD\uFFFD\t\nz"));
+        QCOMPARE(loaded.getText()[0]->getTextItems()[0]->getText(), std::string("\uFFFD"));
     }
 
     void emptyTextIsLostOnTheNextLoad()

@@ -8,6 +8,7 @@ import json
 import os
 import re
 import shutil
+import socket
 import subprocess
 import sys
 import tempfile
@@ -21,7 +22,6 @@ sys.path.insert(0, os.path.join(os.path.dirname(os.path.dirname(HERE)), "scripts
 import session  # noqa: E402  pylint: disable=wrong-import-position
 
 BUILD = os.environ.get("TITLER_BUILD", os.path.join(session.ROOT, "build"))
-OFFSET = int(os.environ.get("TITLER_TEST_OFFSET", "21000"))
 # Sanitizers make everything slower, never wrong.
 SLOW = 4 if os.path.basename(BUILD).endswith("asan") else 1
 
@@ -41,6 +41,20 @@ def pngdiff(*arguments):
     if done.returncode != 0:
         raise session.SessionError(f"titler_pngdiff {arguments}: {done.stderr.strip()}")
     return json.loads(done.stdout)
+
+
+def free_port_offset():
+    """An offset at which all ports are free. It starts at a place of this process: several suites can run at once."""
+    offsets = [20000 + 10 * ((os.getpid() + number) % 1000) for number in range(1000)]
+    for offset in offsets:
+        try:
+            for port in (session.MAIN_PORT, session.SUB_PANEL_PORT, session.TITLER_PORT):
+                with socket.socket() as probe:
+                    probe.bind(("127.0.0.1", port + offset))
+        except OSError:
+            continue
+        return offset
+    raise session.SessionError("no free ports")
 
 
 class Title:
@@ -69,6 +83,8 @@ class TitlerTest(unittest.TestCase):
     """A test case with a running appliance and titler."""
 
     samples = None
+    # Characters to be typed that an ordinary keyboard has not.
+    extra_keys = ""
     titler_arguments = ()
     environment_changes = {}
 
@@ -79,9 +95,10 @@ class TitlerTest(unittest.TestCase):
         # The platform's buffers for paths are short, so the data path is, too.
         self.work = tempfile.mkdtemp(prefix="titler-")
         self.addCleanup(shutil.rmtree, self.work, ignore_errors=True)
+        self.offset = free_port_offset()
         self.environment = session.program_environment(
             BUILD, K2SYS_AC_ROOT="", K2SYS_AC_DATA=os.path.join(self.work, "d"), K2SYS_LOG_DIR=self.keep,
-            K2SYS_PORT_OFFSET=OFFSET, **self.environment_changes)
+            K2SYS_PORT_OFFSET=self.offset, **self.environment_changes)
         self.display = None
         self.appliance = None
         self.titler = None
@@ -90,6 +107,7 @@ class TitlerTest(unittest.TestCase):
         self.base = self.provision()
         self.display = session.Display(os.path.join(self.work, "x"), self.environment)
         self.addCleanup(self.display.stop)
+        self.display.add_keys(self.extra_keys)
         self.environment = self.display.environment
         self.start_programs()
 
@@ -110,8 +128,8 @@ class TitlerTest(unittest.TestCase):
         self.appliance = session.Appliance(BUILD, os.path.join(self.keep, "appliance.log"), self.environment)
         self.addCleanup(self.appliance.stop)
         self.programs.append(self.appliance)
-        session.wait_listening(self.appliance, session.MAIN_PORT + OFFSET, 30 * SLOW)
-        session.wait_listening(self.appliance, session.SUB_PANEL_PORT + OFFSET, 30 * SLOW)
+        session.wait_listening(self.appliance, session.MAIN_PORT + self.offset, 30 * SLOW)
+        session.wait_listening(self.appliance, session.SUB_PANEL_PORT + self.offset, 30 * SLOW)
         self.start_titler()
 
     def start_titler(self):
@@ -120,7 +138,7 @@ class TitlerTest(unittest.TestCase):
                                            self.titler_arguments)
         self.addCleanup(self.titler.stop)
         self.programs.append(self.titler)
-        session.wait_listening(self.titler, session.TITLER_PORT + OFFSET, 60 * SLOW)
+        session.wait_listening(self.titler, session.TITLER_PORT + self.offset, 60 * SLOW)
         self.command("wait-titler")
         # The last service that a titler registers at: from here on every notice reaches it.
         self.wait_call("APPEventFilter", "registerNotify", start, 60)
@@ -288,15 +306,22 @@ class TitlerTest(unittest.TestCase):
             with self.subTest(picture=suffix):
                 self.assertEqual(pngdiff("size", title.picture(suffix)), {"width": width, "height": height})
 
-    def assert_no_leftovers(self, folder):
-        """Nothing but titles, their pictures and the order lies in the folder."""
+    def leftovers(self, folder):
+        """What lies in the folder besides titles, their pictures and the order."""
         known = {".order.xml"}
         for title in self.titles(folder):
             stem = os.path.basename(title.stem)
             known.add(stem + ".xml")
             known.update(stem + suffix for suffix in PICTURES)
             known.update(stem + suffix for suffix in ("_source_1280.png", "_source_1920.png"))
-        self.assertEqual(set(os.listdir(folder)) - known, set())
+        return set(os.listdir(folder)) - known
+
+    def assert_no_leftovers(self, folder):
+        self.assertEqual(self.leftovers(folder), set())
+
+    def wait_no_leftovers(self, folder, timeout=20):
+        """Waits until the versions that are kept while a save is on its way to the disk are gone."""
+        session.wait_until(lambda: not self.leftovers(folder), timeout * SLOW, f"nothing left over in {folder}")
 
     def wait_text(self, title, wanted, timeout=20):
         """Waits until the file holds a text object with this text."""

@@ -10,6 +10,8 @@ KEY_TEXT = "速報 속보 é"
 
 
 class EditTitle(harness.TitlerTest):
+    extra_keys = "".join(dict.fromkeys(KEY_TEXT.replace(" ", "")))
+
     def test_the_canvas_shows_what_goes_on_air(self):
         # A shadow, whose softness is in pixels of either raster, is somewhat wider on the canvas; all else agrees.
         folder = self.folder()

@@ -1,5 +1,6 @@
 """The tools of the end-to-end tests: the picture writer and what titler_pngdiff says about pictures."""
 import os
+import re
 import subprocess
 import tempfile
 import unittest
@@ -69,6 +70,21 @@ class PictureTools(unittest.TestCase):
 
 
 class Screen(unittest.TestCase):
+    def test_spare_keys_take_characters(self):
+        with tempfile.TemporaryDirectory() as folder:
+            display = harness.session.Display(folder, harness.session.program_environment(harness.BUILD))
+            try:
+                display.add_keys("速é")
+                keymap = subprocess.run(["xkbcomp", "-xkb", display.name, "-"], env=display.environment, check=True,
+                                        capture_output=True, text=True).stdout
+                symbols = {key: re.sub(r"\s+", "", text)
+                           for key, text in re.findall(r"key +<(FK1[34])> +{(.*?)};", keymap, re.DOTALL)}
+                self.assertIn("[U901F]", symbols["FK13"])
+                self.assertIn("[eacute]", symbols["FK14"])
+                self.assertRaises(harness.session.SessionError, display.add_keys, "x" * 13)
+            finally:
+                display.stop()
+
     def test_a_display_shows_and_takes_clicks(self):
         with tempfile.TemporaryDirectory() as folder:
             display = harness.session.Display(folder, harness.session.program_environment(harness.BUILD))

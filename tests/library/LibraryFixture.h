@@ -137,10 +137,8 @@ public:
     {
         ArchiveController controller;
         QStringList stems;
-        for (ArchiveOrder* row : controller.getFileOrder(folder)) {
+        for (const ArchiveOrder* row : controller.getFileOrder(folder))
             stems.append(QFileInfo(QString::fromStdString(row->getArchivePath())).completeBaseName());
-            delete row;
-        }
         return stems;
     }
 

@@ -128,11 +128,11 @@ private slots:
     void agreesWithTinyXml()
     {
         static const std::vector<std::string> PIECES = {
-            "<",           ">",          "</",   "/>",        "\"",       "'",     "=",
-            " ",           "<!--",       "-->",  "<![CDATA[", "]]>",      "<?xml", "version=",
-            "encoding=",   "standalone", "&",    ";",        "<a>",   "</a>",
-            "<a b=\"c\">", "<a b='",     "?>",   "<!",        "\n",       "x",     "</manifest>",
-            "<?XML",       "<_",         "\x7f", "<a b=c>",   "<a b=c/>", "中",    "\r"};
+            "<",         ">",          "</",      "/>",        "\"",  "'",           "=",
+            " ",         "<!--",       "-->",     "<![CDATA[", "]]>", "<?xml",       "version=",
+            "encoding=", "standalone", "&",       ";",         "<a>", "</a>",        "<a b=\"c\">",
+            "<a b='",    "?>",         "<!",      "\n",        "x",   "</manifest>", "<?XML",
+            "<_",        "\x7f",       "<a b=c>", "<a b=c/>",  "中",  "\r"};
         QRandomGenerator random(qEnvironmentVariableIntValue("TITLER_FUZZ_SEED"));
         const int ROUNDS = qMax(60000, qEnvironmentVariableIntValue("TITLER_FUZZ_ROUNDS"));
         // Without character references: those that are broken are refused, and TinyXML takes some of them.

@@ -1,0 +1,73 @@
+#include "bench/FastPng.h"
+
+#include <QtEndian>
+#include <cstring>
+#include <libdeflate.h>
+
+namespace
+{
+
+constexpr int FASTEST = 1;
+
+void addNumber(QByteArray& bytes, quint32 number)
+{
+    char big[4];
+    qToBigEndian(number, big);
+    bytes.append(big, sizeof big);
+}
+
+void addChunk(QByteArray& bytes, const char* type, const QByteArray& data)
+{
+    addNumber(bytes, static_cast<quint32>(data.size()));
+    const qsizetype start = bytes.size();
+    bytes.append(type, 4).append(data);
+    addNumber(bytes,
+              libdeflate_crc32(0, bytes.constData() + start, static_cast<std::size_t>(data.size()) + 4));
+}
+
+} // namespace
+
+FastPng::FastPng() : mCompressor(libdeflate_alloc_compressor(FASTEST))
+{
+}
+
+FastPng::~FastPng()
+{
+    libdeflate_free_compressor(mCompressor);
+}
+
+QByteArray FastPng::encode(const QImage& image, Filter filter)
+{
+    const bool alpha = image.hasAlphaChannel();
+    const QImage bytesOrdered =
+        image.convertToFormat(alpha ? QImage::Format_RGBA8888 : QImage::Format_RGB888);
+    const auto lineSize = static_cast<std::size_t>(image.width()) * (alpha ? 4 : 3);
+    const auto size = (lineSize + 1) * static_cast<std::size_t>(image.height());
+    mLines.resize(static_cast<qsizetype>(size));
+    auto* out = reinterpret_cast<uchar*>(mLines.data());
+    for (int y = 0; y < image.height(); ++y) {
+        const uchar* line = bytesOrdered.constScanLine(y);
+        const bool up = filter == Filter::Up && y > 0;
+        *out++ = up ? 2 : 0;
+        if (up) {
+            const uchar* above = bytesOrdered.constScanLine(y - 1);
+            for (std::size_t i = 0; i < lineSize; ++i)
+                out[i] = static_cast<uchar>(line[i] - above[i]);
+        } else {
+            std::memcpy(out, line, lineSize);
+        }
+        out += lineSize;
+    }
+    mPacked.resize(static_cast<qsizetype>(libdeflate_zlib_compress_bound(mCompressor, size)));
+    const std::size_t packed = libdeflate_zlib_compress(mCompressor, mLines.constData(), size, mPacked.data(),
+                                                        static_cast<std::size_t>(mPacked.size()));
+    QByteArray header;
+    addNumber(header, static_cast<quint32>(image.width()));
+    addNumber(header, static_cast<quint32>(image.height()));
+    header.append(char(8)).append(char(alpha ? 6 : 2)).append(3, char(0));
+    QByteArray bytes("\x89PNG\r\n\x1a\n", 8);
+    addChunk(bytes, "IHDR", header);
+    addChunk(bytes, "IDAT", QByteArray::fromRawData(mPacked.constData(), static_cast<qsizetype>(packed)));
+    addChunk(bytes, "IEND", {});
+    return bytes;
+}

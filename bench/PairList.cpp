@@ -1,0 +1,13 @@
+#include "bench/PairList.h"
+
+void PairList::add(const Pair& pair, benchmark::TimeUnit unit, const Body& ours, const Body& floor)
+{
+    const auto enter = [&](const char* side, const Body& body) {
+        auto* entry = benchmark::RegisterBenchmark((pair.name + side).c_str(), body)->Unit(unit);
+        if (pair.clock == Clock::Wall)
+            entry->UseRealTime();
+    };
+    enter("/ours", ours);
+    enter("/floor", floor);
+    mPairs.push_back(pair);
+}

@@ -1,0 +1,170 @@
+// The four picture files of a title, against encoding the same pictures as fast as the libraries at hand can.
+#include "bench/BenchEnvironment.h"
+#include "bench/BenchTitles.h"
+#include "bench/FastPng.h"
+#include "bench/PairList.h"
+#include "bench/Topics.h"
+#include "document/ImageResizer.h"
+#include "library/PictureThread.h"
+#include "library/ThumbnailRender.h"
+#include "support/AtomicFile.h"
+
+#include <QDir>
+#include <QElapsedTimer>
+#include <QPainter>
+#include <QThread>
+#include <array>
+#include <limits>
+
+namespace
+{
+
+constexpr double AIM = 1.2;
+constexpr unsigned long POLL = 50; // microseconds
+constexpr std::array SUFFIXES = {"_960.png", "_1920.png", "_240S.png", "_240.png"};
+
+// What the picture thread is given, and the title it is for.
+struct Job {
+    Archive archive;
+    QList<QImage> images; // big, middle
+
+    QString path(const char* suffix) const
+    {
+        return QString::fromStdString(archive.getPath()).chopped(4) + QLatin1String(suffix);
+    }
+};
+
+void writeChecker()
+{
+    const QString folder =
+        qEnvironmentVariable("K2SYS_AC_DATA") + QStringLiteral("/defaultuser/resources/Templates");
+    QDir().mkpath(folder);
+    QImage checker(PictureThread::THUMBNAIL_SMALL_SIZE, QImage::Format_RGB32);
+    checker.fill(Qt::gray);
+    checker.save(folder + QStringLiteral("/checker_240x135.png"));
+}
+
+Job makeJob(const std::string& path, const QImage& background)
+{
+    Job job{BenchTitles::title(path, 40, 60), {}};
+    QImage big(ThumbnailRender::THUMBNAIL_BIG_SIZE, QImage::Format_ARGB32_Premultiplied);
+    big.fill(Qt::transparent);
+    QPainter painter(&big);
+    painter.setRenderHint(QPainter::Antialiasing);
+    if (!background.isNull())
+        painter.drawImage(0, 0, background);
+    QFont font(QStringLiteral("KST"));
+    font.setPixelSize(60);
+    painter.setFont(font);
+    painter.setPen(Qt::white);
+    for (int line = 1; line <= BenchTitles::TEXTS; ++line)
+        painter.drawText(60, 250 * line, QStringLiteral("Breaking news from the coast, live at ten"));
+    painter.end();
+    job.images = {big, big.scaled(ThumbnailRender::THUMBNAIL_MIDDLE_SIZE, Qt::IgnoreAspectRatio,
+                                  Qt::SmoothTransformation)};
+    return job;
+}
+
+void runThread(PictureThread& thread, const Job& job)
+{
+    thread.addArchive(&job.archive, job.images);
+    while (!thread.isThreadWaiting())
+        QThread::usleep(POLL);
+}
+
+// Whether the files hold the pixels that QImage::save and reading the middle file again would give.
+bool filesAreRight(const Job& job)
+{
+    const QString middle = job.path("_check.png");
+    const std::wstring black = job.path("_checkS.png").toStdWString();
+    const std::wstring small = job.path("_checkC.png").toStdWString();
+    std::wstring source = middle.toStdWString();
+    job.images.at(1).save(middle);
+    std::wstring blackPath = black;
+    std::wstring smallPath = small;
+    const QSize size = PictureThread::THUMBNAIL_SMALL_SIZE;
+    if (!ImageResizer().resizeImageToThumbnail(source, blackPath, smallPath,
+                                               static_cast<unsigned>(size.width()),
+                                               static_cast<unsigned>(size.height())))
+        return false;
+    const QString big = job.path("_checkB.png");
+    job.images.at(0).save(big);
+    const std::array expected = {middle, big, QString::fromStdWString(black), QString::fromStdWString(small)};
+    for (std::size_t i = 0; i < SUFFIXES.size(); ++i) {
+        const QImage read(job.path(SUFFIXES[i]));
+        if (read.isNull() || read != QImage(expected[i]))
+            return false;
+    }
+    return true;
+}
+
+void savePictures(benchmark::State& state, const Job& job)
+{
+    PictureThread thread;
+    runThread(thread, job);
+    if (!filesAreRight(job)) {
+        state.SkipWithError("the pixels of the files are not those of the pictures");
+        return;
+    }
+    for ([[maybe_unused]] auto _ : state)
+        runThread(thread, job);
+}
+
+// The filter that pays depends on the picture.
+FastPng::Filter fasterFilter(FastPng& png, const QImage& image)
+{
+    constexpr int TRIES = 3;
+    qint64 best[2] = {std::numeric_limits<qint64>::max(), std::numeric_limits<qint64>::max()};
+    for (int i = 0; i < TRIES; ++i) {
+        for (const FastPng::Filter filter : {FastPng::Filter::None, FastPng::Filter::Up}) {
+            QElapsedTimer timer;
+            timer.start();
+            png.encode(image, filter);
+            qint64& time = best[filter == FastPng::Filter::Up];
+            time = qMin(time, timer.nsecsElapsed());
+        }
+    }
+    return best[0] < best[1] ? FastPng::Filter::None : FastPng::Filter::Up;
+}
+
+void encodePictures(benchmark::State& state, const Job& job)
+{
+    PictureThread thread;
+    runThread(thread, job);
+    std::vector<QImage> images = {job.images.at(1), job.images.at(0)};
+    for (std::size_t i = images.size(); i < SUFFIXES.size(); ++i)
+        images.emplace_back(job.path(SUFFIXES[i]));
+    FastPng png;
+    const FastPng::Filter filter = fasterFilter(png, images.at(1));
+    for ([[maybe_unused]] auto _ : state) {
+        for (std::size_t i = 0; i < images.size(); ++i) {
+            const QByteArray bytes = png.encode(images[i], filter);
+            if (!AtomicFile::write(job.path(SUFFIXES[i]).toStdString(),
+                                   {bytes.constData(), static_cast<std::size_t>(bytes.size())},
+                                   AtomicFile::Durability::SyncNow))
+                state.SkipWithError("a file cannot be written");
+        }
+    }
+    for (std::size_t i = 0; i < images.size(); ++i) {
+        const QImage read(job.path(SUFFIXES[i]));
+        if (read != images[i].convertToFormat(read.format()))
+            state.SkipWithError("the floor is not lossless");
+    }
+}
+
+} // namespace
+
+void Topics::addPictures(PairList& list, const BenchEnvironment& environment)
+{
+    writeChecker();
+    const std::string folder = environment.makeFolder(QStringLiteral("pictures")).toStdString();
+    const auto add = [&](const char* name, const QImage& background) {
+        const Job job = makeJob(folder + '/' + name + ".xml", background);
+        list.add(
+            {name, AIM, PairList::Clock::Wall}, benchmark::kMillisecond,
+            [job](benchmark::State& state) { savePictures(state, job); },
+            [job](benchmark::State& state) { encodePictures(state, job); });
+    };
+    add("pictures_transparent", {});
+    add("pictures_photograph", BenchTitles::photograph(ThumbnailRender::THUMBNAIL_BIG_SIZE));
+}

@@ -1,0 +1,102 @@
+// From the start of the process to a listening port, with its siblings up, against a program that shows and
+// hides an empty window.
+#include "bench/BenchEnvironment.h"
+#include "bench/PairList.h"
+#include "bench/PeerProcess.h"
+#include "bench/Topics.h"
+#include "messaging/ptc/SocketFrame.h"
+
+#include <QDeadlineTimer>
+#include <QFile>
+#include <QThread>
+
+namespace
+{
+
+constexpr double AIM = 2.0;
+constexpr int START_TIME = 60000;   // milliseconds
+constexpr unsigned long POLL = 200; // microseconds
+constexpr long MAIN = 1000;
+constexpr long SUB_PANEL = 1002;
+constexpr long TITLER = 1003;
+
+QString program(const char* name)
+{
+    return BenchEnvironment::binaryFolder() + QLatin1Char('/') + QLatin1String(name);
+}
+
+// Asks the kernel, so that the listener is not kept busy by a connection.
+bool isListening(long client)
+{
+    QFile table(QStringLiteral("/proc/net/tcp"));
+    if (!table.open(QIODevice::ReadOnly))
+        return false;
+    const QByteArray wanted =
+        "0100007F:" + QByteArray::number(SocketFrame::portOf(client), 16).toUpper().rightJustified(4, '0') +
+        " 00000000:0000 0A ";
+    return table.readAll().contains(wanted);
+}
+
+bool waitListening(long client)
+{
+    const QDeadlineTimer deadline(START_TIME);
+    while (!isListening(client)) {
+        if (deadline.hasExpired())
+            return false;
+        QThread::usleep(POLL);
+    }
+    return true;
+}
+
+// What the titler finds on the appliance: pictures, templates and folders.
+bool provide()
+{
+    static const bool done = [] {
+        PeerProcess provision;
+        return provision.start(program("titler_provision")) && provision.finished(START_TIME);
+    }();
+    return done;
+}
+
+void startTitler(benchmark::State& state)
+{
+    if (!provide()) {
+        state.SkipWithError("the data path cannot be filled");
+        return;
+    }
+    for ([[maybe_unused]] auto _ : state) {
+        state.PauseTiming();
+        {
+            PeerProcess appliance;
+            PeerProcess titler;
+            bool listens = appliance.start(program("appliance"), {QStringLiteral("--stay")}) &&
+                           waitListening(MAIN) && waitListening(SUB_PANEL);
+            state.ResumeTiming();
+            listens = listens && titler.start(program("titler")) && waitListening(TITLER);
+            state.PauseTiming();
+            if (!listens)
+                state.SkipWithError("the programs do not listen");
+        }
+        state.ResumeTiming();
+    }
+}
+
+void startBareWindow(benchmark::State& state)
+{
+    for ([[maybe_unused]] auto _ : state) {
+        PeerProcess window;
+        if (!window.startAndAwait(program("bare_window"), {}, "hidden\n"))
+            state.SkipWithError("the window does not show");
+        state.PauseTiming();
+        window.finished(START_TIME);
+        state.ResumeTiming();
+    }
+}
+
+} // namespace
+
+void Topics::addStart(PairList& list)
+{
+    list.add({"start_to_listening", AIM, PairList::Clock::Wall}, benchmark::kMillisecond, startTitler,
+             startBareWindow);
+}

@@ -1,0 +1,100 @@
+// Reading and writing title files, against the XML library alone on the same files.
+#include "bench/BenchEnvironment.h"
+#include "bench/BenchTitles.h"
+#include "bench/PairList.h"
+#include "bench/Topics.h"
+#include "document/TitleParser.h"
+#include "support/FileSyncQueue.h"
+
+#include <chrono>
+#include <memory>
+#include <tinyxml.h>
+
+namespace
+{
+
+constexpr double AIM = 1.3;
+constexpr int CHARACTERS = 300;
+constexpr int FOLDER_TITLES = 99;
+constexpr std::chrono::seconds SYNC_TIME(10);
+
+bool writeTitle(const std::string& path)
+{
+    Archive archive = BenchTitles::title(path, CHARACTERS, 24);
+    return TitleParser().writeOneTitle(&archive) == 1;
+}
+
+void readAndWrite(benchmark::State& state, const std::string& path)
+{
+    if (!writeTitle(path))
+        state.SkipWithError("the title cannot be written");
+    TitleParser parser;
+    for ([[maybe_unused]] auto _ : state) {
+        Archive archive;
+        if (parser.readOneTitle(path, &archive) != 1 || archive.text().size() != BenchTitles::TEXTS ||
+            parser.writeOneTitle(&archive) != 1) {
+            state.SkipWithError("the title does not come back");
+            break;
+        }
+        // A title is saved once and then left alone: the background thread that brings it to the disk is not
+        // raced by the next save.
+        state.PauseTiming();
+        FileSyncQueue::flush(SYNC_TIME);
+        state.ResumeTiming();
+    }
+}
+
+void loadAndSave(benchmark::State& state, const std::string& path)
+{
+    if (!writeTitle(path))
+        state.SkipWithError("the title cannot be written");
+    for ([[maybe_unused]] auto _ : state) {
+        TiXmlDocument document;
+        if (!document.LoadFile(path.c_str()) || !document.SaveFile()) {
+            state.SkipWithError("the file does not come back");
+            break;
+        }
+    }
+}
+
+void readFolder(benchmark::State& state, const std::string& folder, std::size_t count)
+{
+    TitleParser parser;
+    for ([[maybe_unused]] auto _ : state) {
+        const std::vector<Archive*> titles = parser.getFilsByOrderInFolder(folder);
+        const std::vector<std::unique_ptr<Archive>> owner(titles.begin(), titles.end());
+        if (titles.size() != count) {
+            state.SkipWithError("titles are missing");
+            break;
+        }
+    }
+}
+
+void loadFiles(benchmark::State& state, const std::vector<std::string>& paths)
+{
+    for ([[maybe_unused]] auto _ : state) {
+        for (const std::string& path : paths) {
+            TiXmlDocument document;
+            if (!document.LoadFile(path.c_str()))
+                state.SkipWithError("a file cannot be read");
+        }
+    }
+}
+
+} // namespace
+
+void Topics::addTitleFiles(PairList& list, const BenchEnvironment& environment)
+{
+    const std::string one = environment.makeFolder(QStringLiteral("one")).toStdString();
+    list.add(
+        {"title_read_write", AIM, PairList::Clock::Wall}, benchmark::kMillisecond,
+        [one](benchmark::State& state) { readAndWrite(state, one + "/ours.xml"); },
+        [one](benchmark::State& state) { loadAndSave(state, one + "/floor.xml"); });
+
+    const std::string folder = environment.makeFolder(QStringLiteral("folder")).toStdString();
+    const std::vector<std::string> paths = BenchTitles::writeFolder(folder, FOLDER_TITLES);
+    list.add(
+        {"folder_load", AIM, PairList::Clock::Wall}, benchmark::kMillisecond,
+        [folder, paths](benchmark::State& state) { readFolder(state, folder, paths.size()); },
+        [paths](benchmark::State& state) { loadFiles(state, paths); });
+}

@@ -1,0 +1,17 @@
+// The pairs of each topic.
+#pragma once
+
+class PairList;
+class BenchEnvironment;
+
+namespace Topics
+{
+
+void addMessaging(PairList& list);
+void addPictures(PairList& list, const BenchEnvironment& environment);
+void addRendering(PairList& list, const BenchEnvironment& environment);
+void addStart(PairList& list);
+void addTyping(PairList& list);
+void addTitleFiles(PairList& list, const BenchEnvironment& environment);
+
+} // namespace Topics

@@ -1,0 +1,128 @@
+// One key typed into a long text until it is on screen, against a plain text item with the same formats.
+#include "bench/BenchTitles.h"
+#include "bench/PairList.h"
+#include "bench/Topics.h"
+#include "canvas/CanvasScene.h"
+#include "canvas/CharacterFormat.h"
+#include "canvas/GraphicsView.h"
+#include "canvas/IThumbnailRender.h"
+#include "canvas/StyleDocument.h"
+
+#include <QApplication>
+#include <QGraphicsTextItem>
+#include <QGraphicsView>
+#include <QKeyEvent>
+#include <QTextCursor>
+#include <QTextDocument>
+
+namespace
+{
+
+constexpr double AIM = 3.0;
+constexpr int CHARACTERS = 299;
+const QSize CANVAS(1280, 720);
+
+void key(QGraphicsView& view, Qt::Key code, const QString& text)
+{
+    QKeyEvent press(QEvent::KeyPress, code, Qt::NoModifier, text);
+    QApplication::sendEvent(&view, &press);
+    QKeyEvent release(QEvent::KeyRelease, code, Qt::NoModifier, text);
+    QApplication::sendEvent(&view, &release);
+}
+
+// What the program does at once: updates that the scene has put off, and the paint event of the view.
+void show(QGraphicsView& view)
+{
+    QCoreApplication::processEvents();
+    QCoreApplication::sendPostedEvents(view.viewport(), QEvent::UpdateRequest);
+}
+
+void prepare(QGraphicsView& view)
+{
+    view.setRenderHint(QPainter::Antialiasing);
+    view.setFrameShape(QFrame::NoFrame);
+    view.setHorizontalScrollBarPolicy(Qt::ScrollBarAlwaysOff);
+    view.setVerticalScrollBarPolicy(Qt::ScrollBarAlwaysOff);
+    view.resize(CANVAS);
+    view.show();
+    view.activateWindow();
+    view.setFocus();
+    show(view);
+}
+
+// Types and takes back; only the typing is measured. False when a key did not arrive.
+void typeKeys(benchmark::State& state, QGraphicsView& view, const QTextDocument& document)
+{
+    const int before = document.characterCount();
+    for ([[maybe_unused]] auto _ : state) {
+        key(view, Qt::Key_A, QStringLiteral("a"));
+        show(view);
+        state.PauseTiming();
+        if (document.characterCount() != before + 1) {
+            state.SkipWithError("the key did not arrive");
+            break;
+        }
+        key(view, Qt::Key_Backspace, QString(QChar(8)));
+        show(view);
+        state.ResumeTiming();
+    }
+}
+
+std::unique_ptr<TText> makeText()
+{
+    return BenchTitles::text(1, 10, 10,
+                             {.characters = CHARACTERS, .size = 48, .edgeWidth = 0, .shadow = false});
+}
+
+void typeOnCanvas(benchmark::State& state)
+{
+    Archive archive;
+    archive.setPath("unsaved.xml");
+    archive.setText({makeText().release()});
+    CanvasScene scene(nullptr);
+    scene.setSceneRect(QRectF(QPointF(0, 0), CANVAS));
+    GraphicsView view(&scene);
+    prepare(view);
+    scene.slotUpdateArchive(&archive);
+    GraphicsText* text = scene.findTextItem(1);
+    if (!text) {
+        state.SkipWithError("the title does not show");
+        return;
+    }
+    text->initNewTextSelectAll();
+    key(view, Qt::Key_End, {});
+    show(view);
+    typeKeys(state, view, *text->document());
+}
+
+void typeInPlainItem(benchmark::State& state)
+{
+    const std::unique_ptr<TText> record = makeText();
+    QGraphicsScene scene(QRectF(QPointF(0, 0), CANVAS));
+    auto* item = new QGraphicsTextItem;
+    QTextCursor cursor(item->document());
+    for (const TextStyle* style : record->textItems()) {
+        QTextCharFormat format;
+        format.setFont(CharacterFormat::font(*style, GraphicsText::SCENEPERCENTAGE));
+        format.setForeground(CharacterFormat::color(style->getFontColor()));
+        cursor.insertText(QString::fromStdString(style->getText()), format);
+    }
+    item->setTextInteractionFlags(Qt::TextEditorInteraction);
+    item->setPos(record->getXValue(), record->getYValue());
+    scene.addItem(item);
+    QGraphicsView view(&scene);
+    prepare(view);
+    item->setFocus();
+    cursor.movePosition(QTextCursor::End);
+    item->setTextCursor(cursor);
+    show(view);
+    typeKeys(state, view, *item->document());
+}
+
+} // namespace
+
+void Topics::addTyping(PairList& list)
+{
+    list.add({"key_to_repaint", AIM, PairList::Clock::Cpu}, benchmark::kMicrosecond, typeOnCanvas,
+             typeInPlainItem);
+}

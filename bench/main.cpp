@@ -1,0 +1,99 @@
+// Measures the program against the least that the same work can cost.
+//
+//   titler_bench                 all pairs, then their ratios
+//   titler_bench --strict        the same; the exit code is 1 when a pair misses its aim
+//   titler_bench --memory [N]    resident memory over N sessions (500) instead; takes a second or two for
+//   each titler_bench --benchmark_... as any Google Benchmark program
+#include "bench/BenchEnvironment.h"
+#include "bench/BenchTitles.h"
+#include "bench/CallPeer.h"
+#include "bench/PairReporter.h"
+#include "bench/Topics.h"
+
+#include <QApplication>
+#include <QFileInfo>
+#include <algorithm>
+#include <cstdio>
+#include <cstdlib>
+#include <cstring>
+#include <unistd.h>
+#include <vector>
+
+namespace
+{
+
+int runRole(const char* role, int argc, char* argv[])
+{
+    QCoreApplication application(argc, argv);
+    if (std::strcmp(role, "--raw-peer") == 0)
+        return RawPeer::run();
+    CallPeer peer;
+    return peer.run();
+}
+
+// The programs are driven by mouse and keys on a display, for which there is a script.
+int runMemory(const char* count)
+{
+    const QByteArray build = QFileInfo(BenchEnvironment::binaryFolder()).path().toLocal8Bit();
+    execlp("python3", "python3", "-B", TITLER_MEMORY_SCRIPT, build.constData(), count, nullptr);
+    std::perror("python3");
+    return 2;
+}
+
+int writeTitles(const char* folder, const char* count)
+{
+    constexpr int TEXTS = 3; // leaves room for one more
+    const int wanted = std::atoi(count);
+    return BenchTitles::writeFolder(folder, wanted, TEXTS).size() == static_cast<std::size_t>(wanted) ? 0 : 1;
+}
+
+bool takeOption(std::vector<char*>& arguments, const char* option)
+{
+    return std::erase_if(arguments, [option](const char* a) { return std::strcmp(a, option) == 0; }) > 0;
+}
+
+int runPairs(std::vector<char*> arguments, const BenchEnvironment& environment)
+{
+    const bool strict = takeOption(arguments, "--strict");
+    // Both sides of a pair take turns, so that a busy moment of the machine does not fall on one alone. What
+    // is given on the command line comes later and prevails.
+    char repetitions[] = "--benchmark_repetitions=5";
+    char interleaving[] = "--benchmark_enable_random_interleaving=true";
+    char minimumTime[] = "--benchmark_min_time=0.2";
+    arguments.insert(arguments.begin() + 1, {repetitions, interleaving, minimumTime});
+    int count = static_cast<int>(arguments.size());
+    arguments.push_back(nullptr);
+    benchmark::Initialize(&count, arguments.data());
+    if (benchmark::ReportUnrecognizedArguments(count, arguments.data()))
+        return 2;
+
+    PairList list;
+    Topics::addRendering(list, environment);
+    Topics::addPictures(list, environment);
+    Topics::addTyping(list);
+    Topics::addTitleFiles(list, environment);
+    Topics::addMessaging(list);
+    Topics::addStart(list);
+    PairReporter reporter(list);
+    benchmark::RunSpecifiedBenchmarks(&reporter);
+    benchmark::Shutdown();
+    return reporter.failed() || (strict && reporter.missed() > 0) ? 1 : 0;
+}
+
+} // namespace
+
+int main(int argc, char* argv[])
+{
+    if (argc == 2 && (std::strcmp(argv[1], "--raw-peer") == 0 || std::strcmp(argv[1], "--call-peer") == 0))
+        return runRole(argv[1], argc, argv);
+    if (argc == 4 && std::strcmp(argv[1], "--write-titles") == 0)
+        return writeTitles(argv[2], argv[3]);
+    if (argc >= 2 && std::strcmp(argv[1], "--memory") == 0)
+        return runMemory(argc > 2 ? argv[2] : nullptr);
+    const std::vector<char*> arguments(argv, argv + argc);
+    const BenchEnvironment environment;
+    if (!environment.isValid())
+        return 2;
+    QApplication application(argc, argv);
+    return runPairs(arguments, environment);
+}

@@ -1,0 +1,162 @@
+"""Resident memory of the titler over many sessions, each of which opens a title, adds a text and saves it.
+
+Runs the real programs on an X server of their own; started by titler_bench --memory. Needs Xvfb, openbox and xdotool.
+"""
+import argparse
+import os
+import subprocess
+import sys
+import tempfile
+import time
+
+ROOT = os.path.dirname(os.path.dirname(os.path.abspath(__file__)))
+sys.path.insert(0, os.path.join(ROOT, "scripts"))
+
+import session  # noqa: E402  pylint: disable=wrong-import-position
+
+OFFSET = 27000
+WARM_UP = 25  # sessions after which caches and fonts are filled
+TITLES_A_FOLDER = 90
+GROWTH_AIM = 2048  # kB
+TOTAL_AIM = 1.5
+NEW_TEXT = (810, 41)  # the middle of the buttons, in pixels of the screen
+CLOSE = (1850, 41)
+TOP_WINDOW_MAIN = 2
+
+
+def resident(pid):
+    """Resident memory of a process in kB, and the part of it that is no file."""
+    values = {}
+    with open(f"/proc/{pid}/status", encoding="ascii") as status:
+        for line in status:
+            name, _, value = line.partition(":")
+            if name in ("VmRSS", "RssAnon"):
+                values[name] = int(value.split()[0])
+    return values["VmRSS"], values["RssAnon"]
+
+
+class Run:
+    """The programs on their display, with titles in a data path of their own."""
+
+    def __init__(self, build, folder, count):
+        self.build = build
+        environment = session.program_environment(
+            build, K2SYS_AC_ROOT="", K2SYS_AC_DATA=os.path.join(folder, "d"), K2SYS_LOG_DIR=folder,
+            K2SYS_PORT_OFFSET=OFFSET)
+        base = subprocess.run([self.program("titler_provision")], env=environment, check=True,
+                              stdout=subprocess.PIPE, text=True).stdout.splitlines()[-1]
+        self.paths = []
+        while len(self.paths) < count:
+            titles = os.path.join(base, "resources", "Titles", f"Folder{len(self.paths)}")
+            os.makedirs(titles)
+            subprocess.run([self.program("titler_bench"), "--write-titles", titles, str(TITLES_A_FOLDER)], check=True)
+            self.paths += sorted(os.path.join(titles, name) for name in os.listdir(titles)
+                                 if name.endswith(".xml") and not name.startswith("."))
+        del self.paths[count:]
+        self.folder = folder
+        self.display = session.Display(os.path.join(folder, "x"), environment)
+        self.environment = self.display.environment
+        self.appliance = self.titler = None
+
+    def program(self, name):
+        return os.path.join(self.build, "bin", name)
+
+    def bare_window(self):
+        process = session.Process([self.program("bare_window"), "--stay"], os.path.join(self.folder, "bare.log"),
+                                  self.environment)
+        session.wait_until(lambda: self.display.find_window("bare_window"), 20, "the bare window")
+        self.display.wait_until_still()
+        memory = resident(process.pid)
+        process.stop()
+        return memory
+
+    def start(self):
+        self.appliance = session.Appliance(self.build, os.path.join(self.folder, "appliance.log"), self.environment)
+        for port in (session.MAIN_PORT, session.SUB_PANEL_PORT):
+            session.wait_listening(self.appliance, port + OFFSET)
+        self.titler = session.start_titler(self.build, os.path.join(self.folder, "titler.log"), self.environment)
+        session.wait_listening(self.titler, session.TITLER_PORT + OFFSET)
+        self.command("wait-titler")
+
+    def command(self, line):
+        start = self.appliance.mark()
+        self.appliance.command(line)
+        done = self.appliance.wait_for(lambda event: event.get("command") == line and event["event"] != "call", 30,
+                                       start, f"an answer to {line}")
+        if done["event"] != "ok":
+            raise session.SessionError(f"{line}: {done}")
+
+    def shown(self):
+        self.titler.check()
+        return self.display.find_window("Titler")
+
+    def open(self, path):
+        self.command(f'edit "{path}"')
+        session.wait_until(self.shown, 30, "the window")
+        self.display.wait_until_still()
+
+    def edit_and_close(self):
+        start = self.appliance.mark()
+        self.display.click(*NEW_TEXT)
+        self.appliance.wait_event("call", 20, start, service="SoftKeyBoardController", method="show")
+        self.command("string Breaking 快讯")
+        start = self.appliance.mark()
+        self.display.click(*CLOSE)
+        session.wait_until(lambda: not self.shown(), 30, "the window to go")
+        self.appliance.wait_for(lambda event: event.get("method") == "setTopWindow" and
+                                event["args"]["topWindow"] == TOP_WINDOW_MAIN, 20, start, "the end of the session")
+
+    def stop(self):
+        for process in (self.titler, self.appliance, self.display):
+            if process:
+                process.stop()
+
+
+def measure(run):
+    bare, bare_own = run.bare_window()
+    print(f"bare window: {bare} kB, of it {bare_own} kB of its own", flush=True)
+    run.start()
+    before = opened = None
+    saved = 0
+    started = time.monotonic()
+    for number, path in enumerate(run.paths, 1):
+        was = os.stat(path).st_mtime_ns
+        run.open(path)
+        opened = resident(run.titler.pid)
+        run.edit_and_close()
+        saved += os.stat(path).st_mtime_ns != was
+        if number == 1:
+            print(f"one title open: {opened[0]} kB, of it {opened[1]} kB of its own", flush=True)
+        if number == min(WARM_UP, len(run.paths)):
+            before = resident(run.titler.pid)
+        if number % WARM_UP == 0:
+            now = resident(run.titler.pid)
+            print(f"{number} sessions, {saved} saved: {now[0]} kB, of it {now[1]} kB of its own "
+                  f"({time.monotonic() - started:.0f} s)", flush=True)
+    after = resident(run.titler.pid)
+    growth = after[0] - before[0]
+    if saved != len(run.paths):
+        raise session.SessionError(f"only {saved} of {len(run.paths)} titles were saved")
+    print(f"growth from session {min(WARM_UP, len(run.paths))} to {len(run.paths)}: {growth} kB (aim {GROWTH_AIM})")
+    print(f"with one title open: {opened[0]} kB, {opened[0] / bare:.2f} of the bare window's (aim {TOTAL_AIM})")
+    return growth <= GROWTH_AIM and opened[0] <= TOTAL_AIM * bare
+
+
+def main():
+    parser = argparse.ArgumentParser(description=__doc__)
+    parser.add_argument("build")
+    parser.add_argument("count", nargs="?", type=int, default=500)
+    options = parser.parse_args()
+    with tempfile.TemporaryDirectory(prefix="titler-") as folder:
+        run = Run(options.build, folder, options.count)
+        try:
+            return 0 if measure(run) else 1
+        except session.SessionError as error:
+            print(f"memory: {error}", file=sys.stderr)
+            return 2
+        finally:
+            run.stop()
+
+
+if __name__ == "__main__":
+    sys.exit(main())

@@ -1,0 +1,144 @@
+// A canvas with its surroundings, for tests: view, undo stack, messages, pictures.
+#pragma once
+
+#include "CanvasTestTools.h"
+
+#include "canvas/CanvasScene.h"
+#include "canvas/GraphicsPixmap.h"
+#include "canvas/GraphicsView.h"
+#include "canvas/ICanvasHost.h"
+#include "canvas/IInputLanguageSource.h"
+#include "canvas/MessageBoxController.h"
+#include "canvas/TextPainter.h"
+#include "document/Archive.h"
+#include "document/TitleParser.h"
+#include "touchui/KSSoftKeyboardCursorSettingEvent.h"
+
+#include <QAction>
+#include <QFileInfo>
+#include <QGraphicsRectItem>
+#include <QPen>
+#include <QSignalSpy>
+#include <QTemporaryDir>
+#include <QTest>
+#include <QTextBlock>
+#include <QTextLayout>
+#include <QUndoStack>
+#include <cmath>
+
+class FakeMessages : public MessageBoxController
+{
+public:
+    void setFactory(TitlerToolFactory*) override {}
+    void postMessage(MessageDef::Message_ID id) override { posted.append({int(id), QString()}); }
+    void postMessage(MessageDef::Message_ID id, QString text) override { posted.append({int(id), text}); }
+    void postMessage(MessageDef::Message_ID id, MessageDefine::_emBoxType, QString text) override
+    {
+        posted.append({int(id), text});
+    }
+    void setMessageMainWindow(QWidget*) override {}
+    bool GetTitlerIsTop() override { return true; }
+    QMap<QString, QString> getMapData() override { return {}; }
+    void closeMessage(MessageDefine::_emCloseType) override {}
+
+    QList<QPair<int, QString>> posted;
+};
+
+inline FakeMessages* messages = nullptr;
+
+class FakeHost : public ICanvasHost
+{
+public:
+    bool windowIsVisible() const override { return visible; }
+    bool visible = false;
+};
+
+struct RenderLog {
+    int fast = 0;
+    int slow = 0;
+    bool finished = true;
+    IThumbnailRender* render = nullptr;
+};
+
+class FakeRender : public IThumbnailRender
+{
+public:
+    explicit FakeRender(RenderLog& log) : m_log(log) { m_log.render = this; }
+    void makeThumbnail(const Archive* archive, bool bigSize) override
+    {
+        if (archive)
+            ++(bigSize ? m_log.slow : m_log.fast);
+    }
+    bool makePictureThreadIsFinished() override { return m_log.finished; }
+
+private:
+    RenderLog& m_log;
+};
+
+// A canvas on its view with an undo stack, as the window has it.
+class Canvas
+{
+public:
+    Canvas() : scene(std::make_unique<CanvasScene>(std::make_unique<FakeRender>(log))), view(scene.get())
+    {
+        scene->setSceneRect(GraphicsText::SCENE_RECT);
+        view.setFrameStyle(0);
+        view.setHorizontalScrollBarPolicy(Qt::ScrollBarAlwaysOff);
+        view.setVerticalScrollBarPolicy(Qt::ScrollBarAlwaysOff);
+        view.resize(1280, 720);
+        QObject::connect(scene.get(), &CanvasScene::signalPushUndoCommandIntoStack, &stack,
+                         [this](QUndoCommand* command) { stack.push(command); });
+        title.setPath((folder.path() + "/title.xml").toStdString());
+    }
+    void show()
+    {
+        view.show();
+        QVERIFY(QTest::qWaitForWindowActive(&view));
+    }
+    void open(const QList<TText>& texts)
+    {
+        title.releaseVectorText();
+        std::vector<TText*> records;
+        for (const TText& text : texts)
+            records.push_back(new TText(text));
+        title.setText(records);
+        scene->slotUpdateArchive(&title);
+    }
+    GraphicsText* text(int id) const { return scene->findTextItem(id); }
+    // A point on the first character of the object, in view coordinates.
+    QPoint pointOn(int id) const
+    {
+        const GraphicsText* item = text(id);
+        return view.mapFromScene(item->scenePos() + item->layoutRect().center());
+    }
+    void tap(QPoint point) { QTest::mouseClick(view.viewport(), Qt::LeftButton, {}, point); }
+    void drag(QPoint from, QPoint to)
+    {
+        QTest::mousePress(view.viewport(), Qt::LeftButton, {}, from);
+        QTest::mouseMove(view.viewport(), from + (to - from) / 2);
+        sendMove(from + (to - from) / 2);
+        sendMove(to);
+        QTest::mouseRelease(view.viewport(), Qt::LeftButton, {}, to);
+    }
+    void sendMove(QPoint point)
+    {
+        QMouseEvent move(QEvent::MouseMove, point, view.viewport()->mapToGlobal(point), Qt::NoButton,
+                         Qt::LeftButton, {});
+        QCoreApplication::sendEvent(view.viewport(), &move);
+    }
+    // What lies in the file now.
+    std::unique_ptr<Archive> saved() const
+    {
+        auto archive = std::make_unique<Archive>();
+        return TitleParser().readOneTitle(title.getPath(), archive.get()) == 1 ? std::move(archive) : nullptr;
+    }
+
+    QTemporaryDir folder;
+    Archive title;
+    RenderLog log;
+    QUndoStack stack;
+    std::unique_ptr<CanvasScene> scene;
+    GraphicsView view;
+};
+
+inline const QPoint EmptyPlace(1200, 680);
