@@ -6,14 +6,14 @@
 namespace APPEventDefine
 {
 
-enum LOCKTYPE {
+enum LOCKTYPE : int {
     LOCKTYPE_NONE = 0,
     LOCKTYPE_TOUCH = 1,  // this process holds the touch lock
     LOCKTYPE_OBJECT = 2, // a transient control or a remembered object is in use
 };
 
 // Who sent an event; 3 is this program, which ignores its own echo.
-enum EventRevicer { EVENTREVICER_NONE = 0, EVENTREVICER_TITLER = 3, EVENTREVICER_RESTORE_ALL = 4 };
+enum EventRevicer : int { EVENTREVICER_NONE = 0, EVENTREVICER_TITLER = 3, EVENTREVICER_RESTORE_ALL = 4 };
 
 // Wire: client id (int32), lock type (int32), flag (bool as int), event receiver (int).
 struct _tagAPPEvent {

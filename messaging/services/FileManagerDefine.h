@@ -7,7 +7,7 @@
 namespace FileManagerDefine
 {
 
-enum emTITLECHANGE_TYPE {
+enum emTITLECHANGE_TYPE : int {
     TITLE_PICTURES_CHANGED = 1,
     TITLE_DELETED = 2,
     TITLE_ADDED = 4,
@@ -15,7 +15,7 @@ enum emTITLECHANGE_TYPE {
 };
 
 // File types that this program looks at in notices; all others are of no interest to it.
-enum emFILE_TYPE { FILE_TYPE_FONT = 6, FILE_TYPE_TITLER_TEMPLATE = 8 };
+enum emFILE_TYPE : int { FILE_TYPE_FONT = 6, FILE_TYPE_TITLER_TEMPLATE = 8 };
 
 // Wire: client id (int32), path (wide), change type (int).
 struct tagTitleChangeStatusParam {

@@ -8,7 +8,7 @@ namespace MessageDef
 {
 
 // Numbers of the messages that this program posts; their texts live in the message service.
-enum Message_ID {
+enum Message_ID : int {
     MESSAGE_RENAME_FAILED = 47,
     MESSAGE_FOLDER_EXISTS = 96,
     MESSAGE_FONT_MISSING = 109,
@@ -32,10 +32,10 @@ namespace MessageDefine
 using _emBoxType = int;
 
 // Which button ended a box. Boxes with one button answer with CLOSE_CANCEL.
-enum _emCloseType { CLOSE_CANCEL = 1, CLOSE_OK = 2 };
+enum _emCloseType : int { CLOSE_CANCEL = 1, CLOSE_OK = 2 };
 
 // Who is in front of the operator.
-enum _emTopWindow { TOP_WINDOW_TITLER = 1, TOP_WINDOW_MAIN = 2 };
+enum _emTopWindow : int { TOP_WINDOW_TITLER = 1, TOP_WINDOW_MAIN = 2 };
 
 // Wire: client id, top window; ints.
 struct _tagTopWindowParam {

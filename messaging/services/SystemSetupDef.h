@@ -7,7 +7,7 @@ namespace SystemSetupDef
 {
 
 // Language of the whole appliance. Values beyond these belong to the appliance and mean English here.
-enum emSystemLanguageType {
+enum emSystemLanguageType : int {
     emSystemLanguageUnknown = 0,
     emSystemLanguageEnglish = 1,
     emSystemLanguageChinese = 2,
@@ -15,7 +15,7 @@ enum emSystemLanguageType {
 
 // Language of the soft keyboard. The names tell the script that the font tables pair with the number;
 // every other value selects the Latin-only row.
-enum emInputLanguageType {
+enum emInputLanguageType : int {
     emInputLanguageUnknown = 0,
     emInputLanguageJapanese = 7,
     emInputLanguageKorean = 8,
@@ -24,7 +24,7 @@ enum emInputLanguageType {
 };
 
 // Model of the appliance; 1 is the model sold in China, whose only family is FAMILY_FOR_CN_MODULE.
-enum emInformationModel {
+enum emInformationModel : int {
     emInformationModelDefault = 0,
     emInformationModelChina = 1,
 };
