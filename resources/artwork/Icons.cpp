@@ -10,22 +10,10 @@
 namespace
 {
 
-QPen linePen(const QColor& color)
-{
-    return QPen(color, Tokens::STROKE, Qt::SolidLine, Qt::RoundCap, Qt::RoundJoin);
-}
-
-void begin(QPainter& painter, const QColor& color)
-{
-    painter.setRenderHint(QPainter::Antialiasing);
-    painter.setPen(linePen(color));
-    painter.setBrush(Qt::NoBrush);
-}
-
 // An arrow that turns back to the left: a head, a shaft and a half circle behind it.
 void turnBack(QPainter& painter, const QColor& color)
 {
-    begin(painter, color);
+    Icons::begin(painter, color);
     QPainterPath shaft;
     shaft.moveTo(5, 13);
     shaft.lineTo(22, 13);
@@ -36,6 +24,18 @@ void turnBack(QPainter& painter, const QColor& color)
 }
 
 } // namespace
+
+QPen Icons::linePen(const QColor& color)
+{
+    return QPen(color, Tokens::STROKE, Qt::SolidLine, Qt::RoundCap, Qt::RoundJoin);
+}
+
+void Icons::begin(QPainter& painter, const QColor& color)
+{
+    painter.setRenderHint(QPainter::Antialiasing);
+    painter.setPen(linePen(color));
+    painter.setBrush(Qt::NoBrush);
+}
 
 void Icons::folder(QPainter& painter, const QColor& color)
 {
@@ -137,4 +137,24 @@ void Icons::close(QPainter& painter, const QColor& color)
     begin(painter, color);
     painter.drawLine(QPointF(7, 7), QPointF(29, 29));
     painter.drawLine(QPointF(29, 7), QPointF(7, 29));
+}
+
+void Icons::smallFolder(QPainter& painter, const QColor& color)
+{
+    begin(painter, color);
+    QPainterPath back;
+    back.moveTo(3, 23);
+    back.lineTo(3, 6);
+    back.lineTo(10, 6);
+    back.lineTo(13, 9);
+    back.lineTo(23, 9);
+    back.lineTo(23, 13);
+    painter.drawPath(back);
+    QPainterPath front;
+    front.moveTo(3, 23);
+    front.lineTo(7, 13);
+    front.lineTo(27, 13);
+    front.lineTo(23, 23);
+    front.closeSubpath();
+    painter.drawPath(front);
 }

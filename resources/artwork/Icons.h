@@ -1,6 +1,7 @@
 #pragma once
 
 #include <QColor>
+#include <QPen>
 
 class QPainter;
 
@@ -10,6 +11,10 @@ namespace Icons
 {
 
 constexpr int ICON_BOX = 36;
+
+QPen linePen(const QColor& color);
+// Sets the pen of all icons.
+void begin(QPainter& painter, const QColor& color);
 
 void folder(QPainter& painter, const QColor& color);
 void newText(QPainter& painter, const QColor& color);
@@ -21,5 +26,7 @@ void safeArea(QPainter& painter, const QColor& color);
 // centred.
 void canvasMenu(QPainter& painter, const QColor& color);
 void close(QPainter& painter, const QColor& color);
+// A folder for lists, in a box of 28 by 28.
+void smallFolder(QPainter& painter, const QColor& color);
 
 } // namespace Icons

@@ -9,54 +9,52 @@
 namespace
 {
 
-struct Face {
-    QColor top;
-    QColor bottom;
-    QColor outline;
-    QColor highlight; // inside the upper edge
-};
-
 QRectF insideLine(const QSize& size, qreal inset)
 {
     return QRectF(inset, inset, size.width() - 2 * inset, size.height() - 2 * inset);
 }
 
-Face faceOf(Surfaces::Button state)
+} // namespace
+
+Surfaces::Face Surfaces::faceOf(Button state)
 {
-    using Surfaces::Button;
     switch (state) {
     case Button::Rest:
-        return {Tokens::FACE_TOP, Tokens::FACE_BOTTOM, Tokens::OUTLINE, QColor(116, 116, 116)};
+        return {Tokens::FACE_TOP, Tokens::FACE_BOTTOM, Tokens::OUTLINE, Tokens::FACE_LIGHT, Tokens::BORDER};
     case Button::Pressed:
-        return {Tokens::FACE_PRESSED_TOP, Tokens::FACE_PRESSED_BOTTOM, Tokens::OUTLINE, QColor(14, 14, 14)};
+        return {Tokens::FACE_PRESSED_TOP, Tokens::FACE_PRESSED_BOTTOM, Tokens::ACCENT, QColor(),
+                Tokens::BORDER_PRESSED};
     case Button::Disabled:
-        return {Tokens::FACE_DISABLED, Tokens::FACE_DISABLED, QColor(30, 30, 30), Tokens::FACE_DISABLED};
+        return {Tokens::FACE_DISABLED, Tokens::FACE_DISABLED, Tokens::OUTLINE_DISABLED, QColor(),
+                Tokens::BORDER};
     case Button::SelectedRest:
-        return {Tokens::SELECTED_TOP, Tokens::SELECTED_BOTTOM, Tokens::ACCENT, QColor(98, 128, 214)};
+        return {Tokens::SELECTED_TOP, Tokens::SELECTED_BOTTOM, Tokens::ACCENT, Tokens::SELECTED_LIGHT,
+                Tokens::BORDER};
     case Button::SelectedPressed:
-        return {Tokens::SELECTED_PRESSED_TOP, Tokens::SELECTED_PRESSED_BOTTOM, Tokens::ACCENT,
-                QColor(10, 26, 84)};
+        return {Tokens::SELECTED_PRESSED_TOP, Tokens::SELECTED_PRESSED_BOTTOM, Tokens::ACCENT_LIGHT, QColor(),
+                Tokens::BORDER_PRESSED};
     case Button::SelectedDisabled:
-        return {Tokens::SELECTED_DISABLED, Tokens::SELECTED_DISABLED, QColor(24, 30, 48),
-                Tokens::SELECTED_DISABLED};
+        return {Tokens::SELECTED_DISABLED, Tokens::SELECTED_DISABLED, Tokens::SELECTED_OUTLINE_DISABLED,
+                QColor(), Tokens::BORDER};
     }
     return {};
 }
 
-void drawFace(QPainter& painter, const QSize& size, const Face& face, qreal radius)
+void Surfaces::drawFace(QPainter& painter, const QSize& size, const Face& face, qreal radius)
 {
     painter.setRenderHint(QPainter::Antialiasing);
     QLinearGradient gradient(0, 0, 0, size.height());
     gradient.setColorAt(0, face.top);
     gradient.setColorAt(1, face.bottom);
-    painter.setPen(QPen(face.outline, Tokens::BORDER));
+    painter.setPen(QPen(face.outline, face.border));
     painter.setBrush(gradient);
-    painter.drawRoundedRect(insideLine(size, Tokens::BORDER / 2), radius, radius);
-    painter.setPen(QPen(face.highlight, Tokens::BORDER));
-    painter.drawLine(QPointF(radius, 1.5), QPointF(size.width() - radius, 1.5));
+    painter.drawRoundedRect(insideLine(size, face.border / 2), radius, radius);
+    if (face.light.isValid()) {
+        painter.setPen(QPen(face.light, Tokens::BORDER));
+        painter.drawLine(QPointF(radius, face.border + 0.5),
+                         QPointF(size.width() - radius, face.border + 0.5));
+    }
 }
-
-} // namespace
 
 void Surfaces::button(QPainter& painter, const QSize& size, Button state)
 {
@@ -72,9 +70,23 @@ void Surfaces::toolPlate(QPainter& painter, const QSize& size, Button state)
     drawFace(painter, QSize(size.width(), size.height() - TOP - BOTTOM), faceOf(state), Tokens::RADIUS_PANE);
 }
 
+void Surfaces::switchSeparator(QPainter& painter, const QSize& size, bool enabled)
+{
+    const Face face = faceOf(enabled ? Button::Rest : Button::Disabled);
+    QLinearGradient gradient(0, 0, 0, size.height());
+    gradient.setColorAt(0, face.top);
+    gradient.setColorAt(1, face.bottom);
+    painter.fillRect(QRect(QPoint(0, 0), size), gradient);
+    painter.fillRect(0, 0, size.width(), 1, face.outline);
+    painter.fillRect(0, size.height() - 1, size.width(), 1, face.outline);
+    painter.fillRect(0, 0, 1, size.height(), face.outline);
+    painter.fillRect(size.width() - 1, 0, 1, size.height(), face.outline);
+}
+
 void Surfaces::pane(QPainter& painter, const QSize& size, const QColor& fill)
 {
-    drawFace(painter, size, {fill, fill, Tokens::EDGE_DARK, Tokens::EDGE_LIGHT}, Tokens::RADIUS_PANE);
+    drawFace(painter, size, {fill, fill, Tokens::EDGE_DARK, Tokens::EDGE_LIGHT, Tokens::BORDER},
+             Tokens::RADIUS_PANE);
 }
 
 void Surfaces::dialog(QPainter& painter, const QSize& size)
@@ -93,8 +105,8 @@ void Surfaces::dialog(QPainter& painter, const QSize& size)
 void Surfaces::selectionBar(QPainter& painter, const QSize& size)
 {
     QLinearGradient gradient(0, 0, 0, size.height());
-    gradient.setColorAt(0, Tokens::TITLE_SELECTION_TOP);
-    gradient.setColorAt(1, Tokens::TITLE_SELECTION_BOTTOM);
+    gradient.setColorAt(0, Tokens::SELECTED_TOP);
+    gradient.setColorAt(1, Tokens::SELECTED_BOTTOM);
     painter.fillRect(QRect(QPoint(0, 0), size), gradient);
 }
 
@@ -102,14 +114,14 @@ void Surfaces::horizontalGroove(QPainter& painter, const QSize& size)
 {
     const int half = size.height() / 2;
     painter.fillRect(0, 0, size.width(), half, Tokens::EDGE_DARK);
-    painter.fillRect(0, half, size.width(), size.height() - half, QColor(72, 72, 72));
+    painter.fillRect(0, half, size.width(), size.height() - half, Tokens::GROOVE_LIGHT);
 }
 
 void Surfaces::verticalGroove(QPainter& painter, const QSize& size)
 {
     const int half = size.width() / 2;
     painter.fillRect(0, 0, half, size.height(), Tokens::EDGE_DARK);
-    painter.fillRect(half, 0, size.width() - half, size.height(), QColor(72, 72, 72));
+    painter.fillRect(half, 0, size.width() - half, size.height(), Tokens::GROOVE_LIGHT);
 }
 
 void Surfaces::checker(QPainter& painter, const QRect& area, int cell)
@@ -129,7 +141,7 @@ void Surfaces::canvasFrame(QPainter& painter, const QRect& canvas)
 {
     painter.setRenderHint(QPainter::Antialiasing);
     painter.setPen(Qt::NoPen);
-    painter.setBrush(QColor(72, 72, 72));
+    painter.setBrush(Tokens::GROOVE_LIGHT);
     painter.drawRoundedRect(QRectF(canvas.adjusted(-8, -8, 8, 8)), Tokens::RADIUS_PANE, Tokens::RADIUS_PANE);
     painter.setBrush(Tokens::EDGE_DARK);
     painter.drawRoundedRect(QRectF(canvas.adjusted(-7, -7, 7, 7)), Tokens::RADIUS_PANE - 1,
@@ -152,7 +164,26 @@ void Surfaces::caretHandle(QPainter& painter, const QSize& size, bool pressed)
     drop.closeSubpath();
     QPainterPath round;
     round.addEllipse(circle);
-    painter.setPen(QPen(pressed ? QColor(Qt::white) : Tokens::TEXT, pressed ? 2.0 : 1.0));
-    painter.setBrush(pressed ? QColor(90, 178, 255) : Tokens::ACCENT);
+    painter.setPen(QPen(pressed ? Tokens::TEXT_SELECTED : Tokens::TEXT, pressed ? 2.0 : 1.0));
+    painter.setBrush(pressed ? Tokens::ACCENT_LIGHT : Tokens::ACCENT);
     painter.drawPath(drop.united(round));
+}
+
+void Surfaces::grid(QPainter& painter, const QSize& size)
+{
+    constexpr int MAJOR = 4; // every so many squares a brighter line
+    painter.fillRect(QRect(QPoint(0, 0), size), Tokens::PANEL);
+    for (const bool isMajor : {false, true}) {
+        const QColor& color = isMajor ? Tokens::GRID_MAJOR : Tokens::GRID;
+        for (int at = Tokens::GRID_CELL, index = 1; at < size.width(); at += Tokens::GRID_CELL, ++index) {
+            if ((index % MAJOR == 0) == isMajor) {
+                painter.fillRect(at, 0, 1, size.height(), color);
+            }
+        }
+        for (int at = Tokens::GRID_CELL, index = 1; at < size.height(); at += Tokens::GRID_CELL, ++index) {
+            if ((index % MAJOR == 0) == isMajor) {
+                painter.fillRect(0, at, size.width(), 1, color);
+            }
+        }
+    }
 }

@@ -1,9 +1,9 @@
 // Paints the program's pictures at build time.
 //
 //   titler_artwork COLLECTION FOLDER   the pictures of a resource collection and FOLDER/COLLECTION.qrc
-//   titler_artwork --sheet FILE        one picture that shows them all, to be looked at
+//   titler_artwork --look FOLDER       pages that show them all, and put together, to be looked at
 #include "resources/artwork/ArtworkTable.h"
-#include "resources/artwork/DesignTokens.h"
+#include "resources/artwork/Specimen.h"
 
 #include <QDir>
 #include <QFileInfo>
@@ -47,38 +47,12 @@ bool writeCollection(const QString& collection, const QDir& folder)
     return file.open(QIODevice::WriteOnly) && file.write(list) == list.size() && file.commit();
 }
 
-bool writeSheet(const QString& path)
+bool writeSpecimens(const QDir& folder)
 {
-    constexpr int WIDTH = 1500;
-    constexpr int GAP = 14;
-    constexpr int LABEL = 12;
-    constexpr int LARGEST = 320;
-    QImage sheet(WIDTH, 2400, QImage::Format_RGB32);
-    sheet.fill(Tokens::PANEL);
-    QPainter painter(&sheet);
-    painter.setPen(QColor(150, 150, 150));
-    QFont font = painter.font();
-    font.setPixelSize(9);
-    painter.setFont(font);
-    QPoint at(GAP, GAP);
-    int rowHeight = 0;
-    for (const Picture& picture : artworkTable()) {
-        QImage image = paint(picture);
-        if (image.width() > LARGEST) {
-            image = image.scaledToWidth(LARGEST, Qt::SmoothTransformation);
-        }
-        const int cell = qMax(image.width(), 150);
-        if (at.x() + cell > WIDTH) {
-            at = QPoint(GAP, at.y() + rowHeight + LABEL + GAP);
-            rowHeight = 0;
-        }
-        painter.drawImage(at, image);
-        painter.drawText(QRect(at.x(), at.y() + image.height() + 1, cell + GAP, LABEL), Qt::AlignLeft,
-                         picture.name.section(QLatin1Char('/'), -1));
-        rowHeight = qMax(rowHeight, image.height());
-        at.rx() += cell + GAP;
-    }
-    return sheet.copy(0, 0, WIDTH, at.y() + rowHeight + LABEL + GAP).save(path, "PNG");
+    return QDir().mkpath(folder.path()) &&
+           Specimen::sheet().save(folder.filePath(QStringLiteral("sheet.png"))) &&
+           Specimen::faces().save(folder.filePath(QStringLiteral("faces.png"))) &&
+           Specimen::frames().save(folder.filePath(QStringLiteral("frames.png")));
 }
 
 } // namespace
@@ -88,11 +62,11 @@ int main(int argc, char** argv)
     const QGuiApplication app(argc, argv);
     const QStringList arguments = QGuiApplication::arguments();
     if (arguments.size() != 3) {
-        std::fprintf(stderr, "usage: titler_artwork COLLECTION FOLDER | --sheet FILE\n");
+        std::fprintf(stderr, "usage: titler_artwork COLLECTION FOLDER | --look FOLDER\n");
         return 2;
     }
-    const bool done = arguments.at(1) == QLatin1String("--sheet")
-                          ? writeSheet(arguments.at(2))
+    const bool done = arguments.at(1) == QLatin1String("--look")
+                          ? writeSpecimens(QDir(arguments.at(2)))
                           : writeCollection(arguments.at(1), QDir(arguments.at(2)));
     return done ? 0 : 1;
 }
