@@ -7,8 +7,11 @@
 #include "messaging/ptc/SocketFrame.h"
 
 #include <QDeadlineTimer>
-#include <QFile>
 #include <QThread>
+#include <cerrno>
+#include <netinet/in.h>
+#include <sys/socket.h>
+#include <unistd.h>
 
 namespace
 {
@@ -25,16 +28,21 @@ QString program(const char* name)
     return BenchEnvironment::binaryFolder() + QLatin1Char('/') + QLatin1String(name);
 }
 
-// Asks the kernel, so that the listener is not kept busy by a connection.
+// Asks by taking the port for a moment, which only a listener refuses: a connection would keep the listener
+// busy, and the kernel's table of sockets takes longer to read than the titler to start.
 bool isListening(long client)
 {
-    QFile table(QStringLiteral("/proc/net/tcp"));
-    if (!table.open(QIODevice::ReadOnly))
-        return false;
-    const QByteArray wanted =
-        "0100007F:" + QByteArray::number(SocketFrame::portOf(client), 16).toUpper().rightJustified(4, '0') +
-        " 00000000:0000 0A ";
-    return table.readAll().contains(wanted);
+    const int descriptor = ::socket(AF_INET, SOCK_STREAM | SOCK_CLOEXEC, 0);
+    const int reuse = 1;
+    ::setsockopt(descriptor, SOL_SOCKET, SO_REUSEADDR, &reuse, sizeof reuse);
+    sockaddr_in address{};
+    address.sin_family = AF_INET;
+    address.sin_port = htons(quint16(SocketFrame::portOf(client)));
+    address.sin_addr.s_addr = htonl(INADDR_LOOPBACK);
+    const int result = ::bind(descriptor, reinterpret_cast<const sockaddr*>(&address), sizeof address);
+    const bool refused = result != 0 && errno == EADDRINUSE;
+    ::close(descriptor);
+    return refused;
 }
 
 bool waitListening(long client)

@@ -7,6 +7,7 @@ class BenchEnvironment;
 namespace Topics
 {
 
+void addFilter(PairList& list);
 void addMessaging(PairList& list);
 void addPictures(PairList& list, const BenchEnvironment& environment);
 void addRendering(PairList& list, const BenchEnvironment& environment);

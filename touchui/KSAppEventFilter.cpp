@@ -55,13 +55,11 @@ KSAppEventFilter::~KSAppEventFilter()
 
 bool KSAppEventFilter::eventFilter(QObject* obj, QEvent* event)
 {
+    // Stands before every event of the application: what concerns nobody leaves on the shortest way.
     if (doEventFilter(obj, event)) {
         return true;
     }
-    if (notifyRegEventFilter(obj, event)) {
-        return true;
-    }
-    return QObject::eventFilter(obj, event);
+    return !m_eventFilters.isEmpty() && notifyRegEventFilter(obj, event);
 }
 
 bool KSAppEventFilter::doEventFilter(QObject* obj, QEvent* event)

@@ -1,0 +1,65 @@
+#include "document/TemplateManager.h"
+
+#include "document/ArchiveController.h"
+#include "document/DocumentConstants.h"
+#include "document/LastSettingParser.h"
+#include "document/TitleParserUtility.h"
+#include "support/IPathManagerEx.h"
+
+#include <boost/filesystem.hpp>
+#include <iostream>
+
+TemplateManager* TemplateManager::mInstance = nullptr;
+
+namespace
+{
+
+// Empty when the folder is not told or cannot be made.
+std::string templatesRoot()
+{
+    try {
+        return TitleParserUtility::wstring2String(IPathManagerEx::getInstance()->getTemplatesPath());
+    } catch (const boost::filesystem::filesystem_error&) {
+        return {};
+    }
+}
+
+} // namespace
+
+TemplateManager* TemplateManager::getInstance()
+{
+    if (!mInstance)
+        mInstance = new TemplateManager;
+    return mInstance;
+}
+
+void TemplateManager::cleanUp()
+{
+    delete mInstance;
+    mInstance = nullptr;
+}
+
+std::vector<Archive*> TemplateManager::getTemplates(emTemplateLanguage language)
+{
+    if (mTemplateRootFolder.empty()) {
+        mTemplateRootFolder = templatesRoot();
+        std::cout << "mTemplateRootFolder = " << mTemplateRootFolder << std::endl;
+    }
+    if (mTemplateRootFolder.empty())
+        return {};
+    mLanguageFolder =
+        mTemplateRootFolder + (language == TEMPLATE_LANGUAGE_EN ? TEMPLATE_RES_EN : TEMPLATE_RES_CHS);
+    const QList<Archive*> templates =
+        ArchiveController().getArchiveList(QString::fromStdString(mLanguageFolder));
+    return {templates.begin(), templates.end()};
+}
+
+std::string TemplateManager::loadLastTemplatePath()
+{
+    return LastSettingParser(mLanguageFolder).getTempAttribute(TEMP_LAST_TEMPLATE, TEMP_PATH);
+}
+
+int TemplateManager::saveLastTemplatePath(std::string path)
+{
+    return LastSettingParser(mLanguageFolder).editTempFile(TEMP_LAST_TEMPLATE, TEMP_PATH, path);
+}

@@ -1,0 +1,244 @@
+#include "document/UserTemplateManager.h"
+
+#include "document/Archive.h"
+#include "document/ArchiveController.h"
+#include "document/ArchiveManager.h"
+#include "document/ArchiveOrder.h"
+#include "document/DocumentConstants.h"
+#include "document/LastSettingParser.h"
+#include "document/TitleParserUtility.h"
+#include "support/HiddenName.h"
+#include "support/IPathManagerEx.h"
+#include "support/Utf8.h"
+
+#include <algorithm>
+#include <boost/filesystem.hpp>
+#include <iostream>
+#include <map>
+#include <sys/stat.h>
+
+namespace fs = boost::filesystem;
+
+UserTemplateManager* UserTemplateManager::mInstance = nullptr;
+
+namespace
+{
+
+const std::string TITLE_STEM = "Titler";
+
+// Empty when the folder is not told or cannot be made.
+std::string userTemplatesRoot()
+{
+    try {
+        return TitleParserUtility::wstring2String(IPathManagerEx::getInstance()->getTitlerTemplatesPath());
+    } catch (const fs::filesystem_error&) {
+        return {};
+    }
+}
+
+bool exists(const std::string& path)
+{
+    boost::system::error_code error;
+    return fs::exists(path, error);
+}
+
+bool isFolder(const std::string& path)
+{
+    boost::system::error_code error;
+    return fs::is_directory(path, error);
+}
+
+// Whether this names an entry directly in a folder, and can stand in an XML file.
+bool isEntryName(const std::string& name)
+{
+    return !name.empty() && name != "." && name != ".." && name.find('/') == std::string::npos &&
+           name.find('\0') == std::string::npos && Utf8::isValid(name);
+}
+
+// Names of all that a folder holds, in the directory's order.
+std::vector<std::string> entriesOf(const std::string& folder)
+{
+    std::vector<std::string> names;
+    boost::system::error_code error;
+    for (fs::directory_iterator entry(folder, error), end; !error && entry != end; entry.increment(error))
+        names.push_back(entry->path().filename().string());
+    return names;
+}
+
+// Extension of the pictures in a template's folder, which is that of the first entry with one, whatever it
+// is: whoever makes the folder puts the pictures there first.
+std::string pictureExtensionIn(const std::string& folder)
+{
+    for (const std::string& name : entriesOf(folder)) {
+        const std::size_t dot = name.rfind('.');
+        if (dot != std::string::npos && !HiddenName::isHidden(name))
+            return name.substr(dot);
+    }
+    return {};
+}
+
+// Time of the last change for sorting: seconds above nanoseconds.
+long long timeKey(const struct stat& status)
+{
+    const auto seconds = static_cast<unsigned long long>(status.st_mtim.tv_sec);
+    return static_cast<long long>((seconds << 32) | static_cast<unsigned long long>(status.st_mtim.tv_nsec));
+}
+
+} // namespace
+
+UserTemplateManager* UserTemplateManager::getInstance()
+{
+    if (!mInstance) {
+        mInstance = new UserTemplateManager;
+        mInstance->mRootFolder = userTemplatesRoot();
+        mInstance->mSettingFolder = mInstance->mRootFolder;
+        mInstance->reCreateNewOrderXml();
+    }
+    return mInstance;
+}
+
+void UserTemplateManager::cleanUp()
+{
+    delete mInstance;
+    mInstance = nullptr;
+}
+
+std::vector<Archive*> UserTemplateManager::getTemplates(emTemplateLanguage)
+{
+    const QList<Archive*> templates = ArchiveController().getArchiveList(QString::fromStdString(mRootFolder));
+    return {templates.begin(), templates.end()};
+}
+
+std::string UserTemplateManager::loadLastTemplatePath()
+{
+    return LastSettingParser(mSettingFolder).getTempAttribute(TEMP_LAST_TEMPLATE, TEMP_PATH);
+}
+
+int UserTemplateManager::saveLastTemplatePath(std::string path)
+{
+    return LastSettingParser(mSettingFolder).editTempFile(TEMP_LAST_TEMPLATE, TEMP_PATH, path);
+}
+
+int UserTemplateManager::reCreateNewOrderXml()
+{
+    makeFolderList();
+    return createNewOrderXml();
+}
+
+int UserTemplateManager::makeFolderList()
+{
+    mFolderList.clear();
+    if (!isFolder(mRootFolder)) {
+        std::cout << "S16 folderPath not a directory." << mRootFolder << std::endl;
+        return 0;
+    }
+    std::multimap<long long, std::string> byTime;
+    for (const std::string& name : entriesOf(mRootFolder)) {
+        // One name that XML cannot hold would make the whole order file unreadable.
+        if (!isEntryName(name) || !isFolder(mRootFolder + STR_SLASH + name))
+            continue;
+        if (!exists(mRootFolder + STR_SLASH + name + STR_SLASH + name + XML_EXTENSION) &&
+            !exists(titlePathOf(name)))
+            continue;
+        struct stat status = {};
+        if (::stat(titlePathOf(name).c_str(), &status) != 0) {
+            std::cout << "ERROR ERROR." << std::endl;
+            continue;
+        }
+        byTime.emplace(timeKey(status), name);
+    }
+    for (const auto& [time, name] : byTime)
+        mFolderList.push_back(name);
+    return 1;
+}
+
+int UserTemplateManager::createNewOrderXml()
+{
+    std::vector<ArchiveOrder> rows;
+    rows.reserve(mFolderList.size());
+    for (const std::string& name : mFolderList) {
+        ArchiveOrder row;
+        row.setArchiveIndex(static_cast<int>(rows.size()));
+        row.setArchivePath(name + STR_SLASH + TITLE_STEM + XML_EXTENSION);
+        rows.push_back(row);
+    }
+    return ArchiveManager().setArchivesSortUnderFolder(mRootFolder, std::move(rows));
+}
+
+int UserTemplateManager::renameInOrderXml(std::string oldName, std::string newName)
+{
+    const auto entry = std::find(mFolderList.begin(), mFolderList.end(), oldName);
+    if (entry == mFolderList.end() || !isEntryName(newName))
+        return 0;
+    *entry = std::move(newName);
+    return createNewOrderXml();
+}
+
+int UserTemplateManager::addNewTemplateToLastInOrderXml(std::string name)
+{
+    std::erase(mFolderList, name);
+    if (isEntryName(name))
+        mFolderList.push_back(std::move(name));
+    createNewOrderXml();
+    return 1;
+}
+
+int UserTemplateManager::loadTemplate(std::string name, Archive* archive)
+{
+    if (!archive)
+        return 0;
+    const int result = ArchiveManager().loadArchive(titlePathOf(name), archive);
+    archive->setName(std::move(name));
+    return result;
+}
+
+int UserTemplateManager::createNewTemplateXml(std::string name, Archive* archive)
+{
+    if (!archive)
+        return 0;
+    const std::string folder = mRootFolder + STR_SLASH + name;
+    if (mRootFolder.empty() || !isEntryName(name) || !exists(folder)) {
+        std::cout << "S16 folderPath not found. " << folder << std::endl;
+        return 0;
+    }
+    if (!isFolder(folder)) {
+        std::cout << "S16 folderPath not a directory. " << folder << std::endl;
+        return 0;
+    }
+    const std::string titlePath = titlePathOf(name);
+    if (exists(titlePath))
+        std::cout << "S16 File is already exist. " << titlePath << std::endl;
+    const std::string extension = pictureExtensionIn(folder);
+    archive->setName(std::move(name));
+    archive->setPath(titlePath);
+    archive->setThumbnailSmall(TITLE_STEM + THUMBNAIL_SMALL + extension);
+    archive->setBgResource(TITLE_STEM + BG_SOURCE + extension);
+    archive->setBgResourceBig(TITLE_STEM + BG_SOURCE_BIG + extension);
+    ArchiveManager().saveArchive(archive);
+    return 1;
+}
+
+int UserTemplateManager::deleteTemplatePath(std::string path)
+{
+    const int result = ArchiveManager().deleteArchive(path);
+    const std::string folder = fs::path(path).lexically_normal().parent_path().string();
+    if (isTemplateFolder(folder)) {
+        boost::system::error_code error;
+        fs::remove_all(folder, error);
+    }
+    reCreateNewOrderXml();
+    return result;
+}
+
+std::string UserTemplateManager::titlePathOf(const std::string& name) const
+{
+    return mRootFolder + STR_SLASH + name + STR_SLASH + TITLE_STEM + XML_EXTENSION;
+}
+
+// Paths come from files and from other processes: what is emptied must be one of our folders.
+bool UserTemplateManager::isTemplateFolder(const std::string& folder) const
+{
+    const fs::path root = fs::path(mRootFolder).lexically_normal();
+    return !root.empty() && fs::path(folder).parent_path() == root &&
+           isEntryName(fs::path(folder).filename().string());
+}
