@@ -17,8 +17,6 @@
 namespace
 {
 
-constexpr double MarginShareOfLine = 0.6;
-
 // Styles that the document lays out alike.
 bool sameLayout(const TextStyle& a, const TextStyle& b)
 {
@@ -559,7 +557,7 @@ void TextStyleEditor::adjustLeftAndRightMargin()
         if (block.layout()->lineCount() > 0)
             tallest = std::max(tallest, block.layout()->lineAt(0).height());
     }
-    BOUNDING_RECT_EXPAND_REGION = MarginShareOfLine * tallest;
+    BOUNDING_RECT_EXPAND_REGION = MARGIN_SHARE_OF_LINE * tallest;
     BOUNDING_RECT_EXPAND_REGION_FOR_HANDLE = BOUNDING_RECT_EXPAND_REGION / 2.0;
     const double margin = BOUNDING_RECT_EXPAND_REGION_FOR_HANDLE;
 
