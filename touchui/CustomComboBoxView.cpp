@@ -1,6 +1,7 @@
 #include "touchui/CustomComboBoxView.h"
 
 #include "touchui/FlickMotion.h"
+#include "touchui/KSScrollBar.h"
 
 #include <QKeyEvent>
 #include <QMouseEvent>
@@ -23,6 +24,7 @@ CustomComboBoxView::CustomComboBoxView(QWidget* parent)
     setFrameShape(QFrame::NoFrame);
     setVerticalScrollMode(QAbstractItemView::ScrollPerPixel);
     setHorizontalScrollBarPolicy(Qt::ScrollBarAlwaysOff);
+    setVerticalScrollBar(new KSScrollBar(Qt::Vertical));
     setEditTriggers(QAbstractItemView::NoEditTriggers);
     setSelectionMode(QAbstractItemView::SingleSelection);
     setFocusPolicy(Qt::NoFocus);
