@@ -1,0 +1,38 @@
+#pragma once
+
+#include <QStyledItemDelegate>
+
+class KSTreeView;
+class QLineEdit;
+
+// Paints the cells of a KSTreeView through its style and opens the editors that the model's factory makes.
+class CustomTreeDelegete : public QStyledItemDelegate
+{
+    Q_OBJECT
+public:
+    // The view owns the delegate.
+    explicit CustomTreeDelegete(KSTreeView* view);
+
+    void paint(QPainter* painter, const QStyleOptionViewItem& option,
+               const QModelIndex& index) const override;
+    QSize sizeHint(const QStyleOptionViewItem& option, const QModelIndex& index) const override;
+    QWidget* createEditor(QWidget* parent, const QStyleOptionViewItem& option,
+                          const QModelIndex& index) const override;
+    void setEditorData(QWidget* editor, const QModelIndex& index) const override;
+    // Commits the text of a line edit; other editors are left to the base.
+    void setModelData(QWidget* editor, QAbstractItemModel* model, const QModelIndex& index) const override;
+    void updateEditorGeometry(QWidget* editor, const QStyleOptionViewItem& option,
+                              const QModelIndex& index) const override;
+
+Q_SIGNALS:
+    // A line edit was opened on the cell and has not got its text yet.
+    void signalLineEditInitialize(QLineEdit* editor, const QModelIndex& index) const;
+    // Its text was committed; the model has it.
+    void signalLineEditCommitted(const QString& text, const QModelIndex& index) const;
+
+protected:
+    bool eventFilter(QObject* object, QEvent* event) override;
+
+private:
+    KSTreeView* m_view;
+};

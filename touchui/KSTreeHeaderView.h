@@ -1,0 +1,30 @@
+#pragma once
+
+#include <QEvent>
+#include <QHeaderView>
+
+class KSTreeView;
+class QTouchEvent;
+
+// The header of a KSTreeView: one finger works it like a mouse, a tap on a section sorts.
+class KSTreeHeaderView : public QHeaderView
+{
+    Q_OBJECT
+public:
+    explicit KSTreeHeaderView(KSTreeView* view);
+
+    virtual bool onTouchEvent(QTouchEvent* event);
+
+protected:
+    bool event(QEvent* event) override;
+    bool viewportEvent(QEvent* event) override;
+    void paintSection(QPainter* painter, const QRect& rect, int logicalIndex) const override;
+    void paintEvent(QPaintEvent* event) override;
+    QSize sizeHint() const override;
+
+private:
+    void sendMouse(QEvent::Type type, const QPointF& globalPosition);
+
+    KSTreeView* m_view;
+    int m_touchId = -1;
+};

@@ -1,0 +1,391 @@
+#include "touchui/KSTreeModel.h"
+
+#include "touchui/KSModelAttributeItem.h"
+#include "touchui/KSModelDataItem.h"
+#include "touchui/KSModelTreeDataItem.h"
+#include "touchui/KSTreeModelDefaultSortHelper.h"
+#include "touchui/KSVIEW.h"
+
+#include <QColor>
+#include <algorithm>
+#include <vector>
+
+KSTreeModel::KSTreeModel(KSModelDataFactory* factory, int columnCount, QObject* parent)
+    : QAbstractItemModel(parent)
+    , m_factory(factory)
+    , m_sortHelper(std::make_unique<KSTreeModelDefaultSortHelper>())
+    , m_columnCount(std::max(0, columnCount))
+{
+    installDefaultAttributes();
+    createRoot();
+}
+
+KSTreeModel::~KSTreeModel() = default;
+
+void KSTreeModel::installDefaultAttributes()
+{
+    setDefaultAttribute(KSVIEW::ItemEnableRole, true);
+    setDefaultAttribute(KSVIEW::ItemEditableRole, false);
+    setDefaultAttribute(KSVIEW::ItemIsForderRole, false);
+    setDefaultAttribute(KSVIEW::ItemHeightRole, 0);
+    setDefaultAttribute(KSVIEW::ItemCheckableRole, false);
+    setDefaultAttribute(KSVIEW::ItemSelectableRole, true);
+    setDefaultAttribute(KSVIEW::ItemDragEnableRole, false);
+    setDefaultAttribute(KSVIEW::ItemDropEnableRole, false);
+    setDefaultAttribute(KSVIEW::OnOrPartialChildrenNumberRole, 0);
+    setDefaultAttribute(Qt::CheckStateRole, static_cast<int>(Qt::Unchecked));
+}
+
+std::unique_ptr<KSModelItem> KSTreeModel::createItem()
+{
+    return std::make_unique<KSModelTreeDataItem>();
+}
+
+void KSTreeModel::createRoot()
+{
+    m_root = createItem();
+    m_root->setRoot(m_root.get());
+    m_root->attributes()->setAttribute(KSVIEW::ItemIsForderRole, true, 0);
+    m_currentRoot = m_root.get();
+}
+
+void KSTreeModel::createDataItems()
+{
+    beginResetModel();
+    createRoot();
+    if (m_factory != nullptr) {
+        m_factory->importSourceData();
+    }
+    fillChildren(m_root.get());
+    endResetModel();
+}
+
+int KSTreeModel::createTreeItemChildren(KSModelItem* item)
+{
+    if (item == nullptr) {
+        return 0;
+    }
+    if (!item->dataItem()->isChildrenCreated()) {
+        fillChildren(item);
+    }
+    return item->childCount();
+}
+
+// Rows that were put in by hand have no source and so no children there.
+void KSTreeModel::fillChildren(KSModelItem* item)
+{
+    item->dataItem()->setChildrenCreated(true);
+    void* source = item->dataItem()->getSourceData();
+    if (m_factory == nullptr || (source == nullptr && item != m_root.get())) {
+        return;
+    }
+    const bool checked = item->attributes()->getAttribute(Qt::CheckStateRole, 0).toInt() == Qt::Checked;
+    for (void* node = m_factory->getChildNode(source); node != nullptr; node = m_factory->getNextNode(node)) {
+        std::unique_ptr<KSModelItem> child = createItem();
+        child->dataItem()->setSourceData(node);
+        m_factory->InstallItemAttribute(child->attributes(), node);
+        if (checked) {
+            child->attributes()->setAttribute(Qt::CheckStateRole, static_cast<int>(Qt::Checked), 0);
+        }
+        item->addChild(std::move(child));
+    }
+    if (m_sortColumn >= 0) {
+        sortChildren(item, false);
+    }
+}
+
+bool KSTreeModel::isOwnIndex(const QModelIndex& index) const
+{
+    return index.isValid() && index.model() == this && index.internalPointer() != nullptr;
+}
+
+KSModelItem* KSTreeModel::itemOf(const QModelIndex& index) const
+{
+    return isOwnIndex(index) ? static_cast<KSModelItem*>(index.internalPointer()) : nullptr;
+}
+
+KSModelItem* KSTreeModel::itemOrRoot(const QModelIndex& index) const
+{
+    return index.isValid() ? itemOf(index) : m_currentRoot;
+}
+
+QModelIndex KSTreeModel::indexOf(KSModelItem* item, int column) const
+{
+    if (item == nullptr || item == m_currentRoot || item->parent() == nullptr || column < 0 ||
+        column >= m_columnCount) {
+        return QModelIndex();
+    }
+    return createIndex(item->parent()->indexOfChildList(item), column, item);
+}
+
+void KSTreeModel::setCurrentRoot(const QModelIndex& index)
+{
+    KSModelItem* item = itemOf(index);
+    beginResetModel();
+    m_currentRoot = item != nullptr ? item : m_root.get();
+    createTreeItemChildren(m_currentRoot);
+    endResetModel();
+}
+
+void KSTreeModel::setDefaultAttribute(int role, const QVariant& value, int column)
+{
+    m_defaultAttributes[role].insert(column, value);
+}
+
+QVariant KSTreeModel::getDefaultAttribute(int role, int column) const
+{
+    const QMap<int, QVariant> columns = m_defaultAttributes.value(role);
+    return columns.contains(column) ? columns.value(column) : columns.value(-1);
+}
+
+QVariant KSTreeModel::getHeaderAttribute(int role) const
+{
+    return m_headerAttributes.value(role);
+}
+
+void KSTreeModel::setHeaderAttribute(int role, const QVariant& value)
+{
+    m_headerAttributes.insert(role, value);
+    if (m_columnCount > 0) {
+        Q_EMIT headerDataChanged(Qt::Horizontal, 0, m_columnCount - 1);
+    }
+}
+
+QColor KSTreeModel::getHeaderTextColor(int section) const
+{
+    return headerData(section, Qt::Horizontal, Qt::ForegroundRole).value<QColor>();
+}
+
+bool KSTreeModel::getItemEnable(const QModelIndex& index) const
+{
+    return data(index, KSVIEW::ItemEnableRole).toBool();
+}
+
+bool KSTreeModel::isForder(const QModelIndex& index) const
+{
+    return data(index.siblingAtColumn(0), KSVIEW::ItemIsForderRole).toBool();
+}
+
+bool KSTreeModel::getCheckable(const QModelIndex& index) const
+{
+    return data(index, KSVIEW::ItemCheckableRole).toBool();
+}
+
+bool KSTreeModel::isRecording(const QModelIndex& index) const
+{
+    return data(index.siblingAtColumn(0), KSVIEW::ItemRecordingRole).toBool();
+}
+
+int KSTreeModel::getItemHeight(const QModelIndex& index) const
+{
+    return std::max(0, data(index.siblingAtColumn(0), KSVIEW::ItemHeightRole).toInt());
+}
+
+int KSTreeModel::getOnOrPartialChildrenNumber(const QModelIndex& index) const
+{
+    return data(index.siblingAtColumn(0), KSVIEW::OnOrPartialChildrenNumberRole).toInt();
+}
+
+bool KSTreeModel::areChildrenMade(const QModelIndex& index) const
+{
+    KSModelItem* item = itemOrRoot(index);
+    return item != nullptr && item->dataItem()->isChildrenCreated();
+}
+
+QModelIndexList KSTreeModel::madeIndexesWith(int role) const
+{
+    QModelIndexList found;
+    const QList<KSModelItem*> items = m_root->children(true);
+    for (KSModelItem* item : items) {
+        if (item->attributes()->getAttribute(role, 0).toInt() != 0) {
+            found.append(indexOf(item));
+        }
+    }
+    return found;
+}
+
+void KSTreeModel::setAttributeOfAll(int role, const QVariant& value)
+{
+    const QList<KSModelItem*> items = m_root->children(true);
+    for (KSModelItem* item : items) {
+        if (!item->attributes()->getAttribute(role, 0).isValid()) {
+            continue;
+        }
+        item->attributes()->setAttribute(role, value, 0);
+        const QModelIndex changed = indexOf(item);
+        Q_EMIT dataChanged(changed, changed.siblingAtColumn(m_columnCount - 1), {role});
+    }
+}
+
+void KSTreeModel::setSortHelper(std::unique_ptr<KSTreeModelSortHelper> helper)
+{
+    if (helper != nullptr) {
+        m_sortHelper = std::move(helper);
+    }
+}
+
+QModelIndex KSTreeModel::index(int row, int column, const QModelIndex& parent) const
+{
+    if (column < 0 || column >= m_columnCount || row < 0 || row >= rowCount(parent)) {
+        return QModelIndex();
+    }
+    return createIndex(row, column, itemOrRoot(parent)->child(row));
+}
+
+QModelIndex KSTreeModel::parent(const QModelIndex& child) const
+{
+    KSModelItem* item = itemOf(child);
+    return item == nullptr ? QModelIndex() : indexOf(item->parent());
+}
+
+int KSTreeModel::rowCount(const QModelIndex& parent) const
+{
+    // The children come into being with the question about them, so nothing was ever told about their
+    // absence and no signal is due.
+    return parent.column() > 0 ? 0
+                               : const_cast<KSTreeModel*>(this)->createTreeItemChildren(itemOrRoot(parent));
+}
+
+int KSTreeModel::columnCount(const QModelIndex&) const
+{
+    return m_columnCount;
+}
+
+bool KSTreeModel::hasChildren(const QModelIndex& parent) const
+{
+    KSModelItem* item = itemOrRoot(parent);
+    if (item == nullptr || parent.column() > 0 || m_columnCount == 0) {
+        return false;
+    }
+    if (item->dataItem()->isChildrenCreated()) {
+        return item->childCount() > 0;
+    }
+    void* source = item->dataItem()->getSourceData();
+    return m_factory != nullptr && (source != nullptr || item == m_root.get()) &&
+           m_factory->getChildNode(source) != nullptr;
+}
+
+QVariant KSTreeModel::data(const QModelIndex& index, int role) const
+{
+    KSModelItem* item = itemOf(index);
+    if (item == nullptr) {
+        return QVariant();
+    }
+    const auto value = [&](int which) {
+        const QVariant own = item->attributes()->getAttribute(which, index.column());
+        return own.isValid() ? own : getDefaultAttribute(which, index.column());
+    };
+    if (role == Qt::CheckStateRole && !value(KSVIEW::ItemCheckableRole).toBool()) {
+        return QVariant(); // any value would draw a box
+    }
+    const QVariant found = value(role);
+    return role == Qt::EditRole && !found.isValid() ? value(Qt::DisplayRole) : found;
+}
+
+bool KSTreeModel::setData(const QModelIndex& index, const QVariant& value, int role)
+{
+    KSModelItem* item = itemOf(index);
+    if (item == nullptr) {
+        return false;
+    }
+    QList<int> roles = {role};
+    item->attributes()->setAttribute(role, value, index.column());
+    if (role == Qt::EditRole) {
+        item->attributes()->setAttribute(Qt::DisplayRole, value, index.column());
+        roles.append(Qt::DisplayRole);
+    }
+    const bool shared = item->attributes()->getAttributeMaxKey(role) == 0;
+    Q_EMIT dataChanged(shared ? index.siblingAtColumn(0) : index,
+                       shared ? index.siblingAtColumn(m_columnCount - 1) : index, roles);
+    return true;
+}
+
+QVariant KSTreeModel::headerData(int section, Qt::Orientation orientation, int role) const
+{
+    if (orientation != Qt::Horizontal || section < 0 || section >= m_columnCount) {
+        return QVariant();
+    }
+    const QVariant own = m_headerData.value(section).value(role);
+    return own.isValid() ? own : getHeaderAttribute(role);
+}
+
+bool KSTreeModel::setHeaderData(int section, Qt::Orientation orientation, const QVariant& value, int role)
+{
+    if (orientation != Qt::Horizontal || section < 0 || section >= m_columnCount) {
+        return false;
+    }
+    m_headerData[section].insert(role == Qt::EditRole ? static_cast<int>(Qt::DisplayRole) : role, value);
+    Q_EMIT headerDataChanged(orientation, section, section);
+    return true;
+}
+
+Qt::ItemFlags KSTreeModel::flags(const QModelIndex& index) const
+{
+    if (itemOf(index) == nullptr) {
+        return Qt::NoItemFlags;
+    }
+    const auto has = [&](int role) { return data(index, role).toBool(); };
+    Qt::ItemFlags flags = Qt::NoItemFlags;
+    flags.setFlag(Qt::ItemIsEnabled, has(KSVIEW::ItemEnableRole));
+    flags.setFlag(Qt::ItemIsSelectable, has(KSVIEW::ItemSelectableRole));
+    flags.setFlag(Qt::ItemIsEditable, has(KSVIEW::ItemEditableRole));
+    flags.setFlag(Qt::ItemIsUserCheckable, has(KSVIEW::ItemCheckableRole));
+    flags.setFlag(Qt::ItemIsDragEnabled, has(KSVIEW::ItemDragEnableRole));
+    flags.setFlag(Qt::ItemIsDropEnabled, has(KSVIEW::ItemDropEnableRole));
+    return flags;
+}
+
+bool KSTreeModel::insertRows(int row, int count, const QModelIndex& parent)
+{
+    KSModelItem* item = itemOrRoot(parent);
+    if (item == nullptr || count < 1 || row < 0 || row > rowCount(parent)) {
+        return false;
+    }
+    beginInsertRows(parent, row, row + count - 1);
+    for (int i = 0; i < count; ++i) {
+        item->addChild(createItem(), row + i);
+    }
+    endInsertRows();
+    return true;
+}
+
+bool KSTreeModel::removeRows(int row, int count, const QModelIndex& parent)
+{
+    KSModelItem* item = itemOrRoot(parent);
+    if (item == nullptr || count < 1 || row < 0 || count > rowCount(parent) - row) {
+        return false;
+    }
+    beginRemoveRows(parent, row, row + count - 1);
+    std::vector<std::unique_ptr<KSModelItem>> removed; // alive until nobody holds an index of them
+    for (int i = 0; i < count; ++i) {
+        removed.push_back(item->remove(row));
+    }
+    endRemoveRows();
+    return true;
+}
+
+bool KSTreeModel::moveRows(const QModelIndex& sourceParent, int sourceRow, int count,
+                           const QModelIndex& destinationParent, int destinationChild)
+{
+    KSModelItem* from = itemOrRoot(sourceParent);
+    KSModelItem* to = itemOrRoot(destinationParent);
+    if (from == nullptr || to == nullptr || count < 1 || sourceRow < 0 ||
+        count > rowCount(sourceParent) - sourceRow || destinationChild < 0 ||
+        destinationChild > rowCount(destinationParent) ||
+        !beginMoveRows(sourceParent, sourceRow, sourceRow + count - 1, destinationParent, destinationChild)) {
+        return false;
+    }
+    std::vector<std::unique_ptr<KSModelItem>> taken;
+    for (int i = 0; i < count; ++i) {
+        taken.push_back(from->remove(sourceRow));
+    }
+    int row = destinationChild;
+    if (from == to && destinationChild > sourceRow) {
+        row -= count; // the gap closed before the destination
+    }
+    for (auto& item : taken) {
+        to->addChild(std::move(item), row++);
+    }
+    endMoveRows();
+    return true;
+}

@@ -1,0 +1,5 @@
+#include "touchui/KSTreeModelSortHelper.h"
+
+KSTreeModelSortHelper::KSTreeModelSortHelper(QObject* parent) : QObject(parent)
+{
+}
