@@ -1,0 +1,31 @@
+#pragma once
+
+#include <QAbstractItemDelegate>
+#include <QPixmap>
+
+// Paints the rows of a combo box's list: the cursor behind the chosen or pressed row, an icon, the text.
+class CustomComboBoxDelegate : public QAbstractItemDelegate
+{
+    Q_OBJECT
+public:
+    explicit CustomComboBoxDelegate(QObject* parent = nullptr);
+
+    static constexpr int ROW_HEIGHT = 56;
+    static constexpr int TEXT_MARGIN = 14;
+
+    // A row shows a field of its colour: that of Qt::BackgroundRole, else of Qt::DecorationRole, else the one
+    // that its text names.
+    void setColorPallete(bool on) { m_colorPallete = on; }
+    bool colorPallete() const { return m_colorPallete; }
+
+    void paint(QPainter* painter, const QStyleOptionViewItem& option,
+               const QModelIndex& index) const override;
+    QSize sizeHint(const QStyleOptionViewItem& option, const QModelIndex& index) const override;
+
+    // The invalid colour for a row without one.
+    static QColor rowColor(const QModelIndex& index);
+
+private:
+    QPixmap m_cursor;
+    bool m_colorPallete = false;
+};

@@ -1,0 +1,457 @@
+#include "touchui/KSCombobox.h"
+
+#include "touchui/BalloonWindow.h"
+#include "touchui/CustomComboBoxDelegate.h"
+#include "touchui/CustomComboBoxView.h"
+#include "touchui/KSEventProcessLockObject.h"
+#include "touchui/OutsidePressFilter.h"
+#include "touchui/SliceFrame.h"
+
+#include <QCoreApplication>
+#include <QKeyEvent>
+#include <QLayout>
+#include <QLineEdit>
+#include <QMouseEvent>
+#include <QPainter>
+#include <QProxyStyle>
+#include <QStandardItemModel>
+#include <QStyleOptionComboBox>
+#include <QTouchEvent>
+
+#include <algorithm>
+
+namespace
+{
+
+constexpr int FRAME = 8;        // of the list's window
+constexpr int TEXT_MARGIN = 10; // of the closed box
+constexpr int WITHOUT_BAR = 44; // what a list is wider than its longest text
+constexpr int WITH_BAR = 76;    // the same beside a scroll bar
+constexpr int TEXT_PIXELS = 24;
+const QColor TEXT_COLOR(220, 220, 220);
+const QColor DISABLED_COLOR(102, 102, 102);
+
+// The list is one that scrolls, not a menu over the box with arrows at its ends.
+class ComboStyle : public QProxyStyle
+{
+public:
+    ComboStyle() : QProxyStyle(QStringLiteral("Fusion")) {}
+
+    int styleHint(StyleHint hint, const QStyleOption* option, const QWidget* widget,
+                  QStyleHintReturn* returnData) const override
+    {
+        switch (hint) {
+        case SH_ComboBox_Popup:
+        case SH_Menu_FlashTriggeredItem:
+        case SH_Menu_FadeOutOnHide:
+            return 0;
+        default:
+            return QProxyStyle::styleHint(hint, option, widget, returnData);
+        }
+    }
+};
+
+} // namespace
+
+KSCombobox::KSCombobox(QWidget* parent)
+    : QComboBox(parent), m_view(new CustomComboBoxView), m_delegate(new CustomComboBoxDelegate(this))
+{
+    auto* look = new ComboStyle;
+    look->setParent(this);
+    setStyle(look);
+    setAttribute(Qt::WA_AcceptTouchEvents);
+    setFocusPolicy(Qt::NoFocus);
+    QFont textFont = font();
+    textFont.setPixelSize(TEXT_PIXELS);
+    setFont(textFont);
+    setView(m_view);
+    setItemDelegate(m_delegate);
+    connect(m_view, &CustomComboBoxView::signalTapped, this, &KSCombobox::choose);
+    setBackgroundImagesPath(QStringLiteral(":/TextToolPanel_TextBox/TextBox_Edittable"));
+    initPopup();
+}
+
+KSCombobox::~KSCombobox()
+{
+    m_popup->removeEventFilter(this);
+    if (m_shown && KSEventProcessLockObject::s_instance != nullptr) {
+        KSEventProcessLockObject::s_instance->tryUnlock(this, LOCKMETHOD_OTHER);
+    }
+}
+
+// Takes over the window that the base keeps the list in.
+void KSCombobox::initPopup()
+{
+    m_popup = m_view->parentWidget();
+    m_view->removeEventFilter(m_popup);
+    m_view->viewport()->removeEventFilter(m_popup);
+    m_popup->setWindowFlags(Qt::ToolTip | Qt::FramelessWindowHint | Qt::NoDropShadowWindowHint |
+                            Qt::WindowDoesNotAcceptFocus);
+    m_popup->setAttribute(Qt::WA_TranslucentBackground);
+    m_popup->setAttribute(Qt::WA_ShowWithoutActivating);
+    m_popup->setAttribute(Qt::WA_X11NetWmWindowTypeCombo, false);
+    m_popup->layout()->setContentsMargins(FRAME, FRAME, FRAME, FRAME);
+    m_popup->installEventFilter(this);
+    m_outsidePress = new OutsidePressFilter(m_popup, this);
+    connect(m_outsidePress, &OutsidePressFilter::pressedOutside, this, &KSCombobox::hidePopup);
+}
+
+void KSCombobox::setBackgroundImagesPath(const QString& path)
+{
+    const auto load = [&path](Slices& slices, const QString& state) {
+        const char* const names[] = {"_Left", "_Center", "_Pulldown"};
+        for (std::size_t i = 0; i < slices.size(); ++i) {
+            slices[i] = QPixmap(path + state + QLatin1String(names[i]));
+        }
+    };
+    load(m_rest, QString());
+    load(m_pressedSlices, QStringLiteral("_Pressed"));
+    load(m_disabledSlices, QStringLiteral("_Disable"));
+    update();
+}
+
+void KSCombobox::setColorPallete(bool on)
+{
+    m_delegate->setColorPallete(on);
+    update();
+}
+
+void KSCombobox::setUSBEnabled(bool enabled)
+{
+    auto* items = qobject_cast<QStandardItemModel*>(model());
+    if (items == nullptr) {
+        return;
+    }
+    for (int row = 0; row < items->rowCount(); ++row) {
+        QStandardItem* item = items->item(row);
+        if (item != nullptr && item->data(USBRole).toBool()) {
+            item->setEnabled(enabled);
+        }
+    }
+}
+
+void KSCombobox::setEnabled(bool enabled)
+{
+    QComboBox::setEnabled(enabled);
+}
+
+void KSCombobox::setDisabled(bool disabled)
+{
+    QComboBox::setDisabled(disabled);
+}
+
+bool KSCombobox::isPopupVisible() const
+{
+    return m_popup->isVisible();
+}
+
+void KSCombobox::showPopup()
+{
+    if (m_popup->isVisible()) {
+        return;
+    }
+    Q_EMIT signalPopupShow();
+    if (count() == 0 || !m_popupEnable || !QWidget::isEnabled()) {
+        return;
+    }
+    m_shown = true;
+    // So that the list closes when another process needs the touch.
+    if (KSEventProcessLockObject::s_instance != nullptr) {
+        KSEventProcessLockObject::s_instance->tryLock(this, LOCKMETHOD_OTHER, nullptr);
+    }
+    Q_EMIT signalShowComboxList(true);
+    m_view->setFont(font());
+    adjustPopupListSize();
+    adjustPopupListPostion();
+    m_popup->show();
+    m_popup->raise();
+    const QModelIndex current = model()->index(currentIndex(), modelColumn(), rootModelIndex());
+    m_view->setCurrentIndex(current);
+    m_view->scrollTo(current, QAbstractItemView::PositionAtCenter);
+    m_outsidePress->start();
+}
+
+void KSCombobox::hidePopup()
+{
+    QComboBox::hidePopup();
+}
+
+void KSCombobox::popupHidden()
+{
+    m_outsidePress->stop();
+    setPressed(false);
+    if (!m_shown) {
+        return;
+    }
+    m_shown = false;
+    if (KSEventProcessLockObject::s_instance != nullptr) {
+        KSEventProcessLockObject::s_instance->tryUnlock(this, LOCKMETHOD_OTHER);
+    }
+    Q_EMIT signalShowComboxList(false);
+}
+
+int KSCombobox::listWidth(int width, int textWidth, bool byText, bool withScrollBar)
+{
+    if (!byText || width >= textWidth + WITHOUT_BAR) {
+        return width;
+    }
+    return textWidth + (withScrollBar ? WITH_BAR : WITHOUT_BAR);
+}
+
+void KSCombobox::setListWidth(int width, int textWidth)
+{
+    const int wanted = listWidth(width, textWidth, m_listWidthByText, count() > maxVisibleItems());
+    m_popup->setFixedWidth(qMin(wanted, BalloonWindow::bounds(nullptr, mapToGlobal(QPoint())).width()));
+}
+
+int KSCombobox::longestTextWidth() const
+{
+    int longest = 0;
+    for (int row = 0; row < count(); ++row) {
+        longest = qMax(longest, fontMetrics().horizontalAdvance(itemText(row)));
+    }
+    return longest;
+}
+
+void KSCombobox::adjustPopupListSize()
+{
+    setListWidth(width(), m_listWidthByText ? longestTextWidth() : 0);
+    const int rowHeight = qMax(1, m_view->sizeHintForRow(0));
+    const int room = BalloonWindow::bounds(nullptr, mapToGlobal(QPoint())).height() - 2 * FRAME;
+    const int rows = qMax(1, qMin(qMin(count(), maxVisibleItems()), room / rowHeight));
+    m_popup->setFixedHeight(rows * rowHeight + 2 * FRAME);
+    m_view->setVerticalScrollBarPolicy(rows < count() ? Qt::ScrollBarAlwaysOn : Qt::ScrollBarAlwaysOff);
+}
+
+void KSCombobox::adjustPopupListPostion()
+{
+    const QRect box(mapToGlobal(QPoint(0, 0)), size());
+    const QRect bounds = BalloonWindow::bounds(nullptr, box.center());
+    const QSize list = m_popup->size();
+    const int below = box.y() + box.height();
+    const int above = box.y() - list.height();
+    const bool fitsBelow = below + list.height() <= bounds.y() + bounds.height();
+    const bool fitsAbove = above >= bounds.y();
+    const bool upper = m_popupUpper ? fitsAbove || !fitsBelow : !fitsBelow && fitsAbove;
+    const int x = qMax(qMin(box.x(), bounds.x() + bounds.width() - list.width()), bounds.x());
+    const int lowest = bounds.y() + bounds.height() - list.height();
+    m_popup->move(x, qMax(qMin(upper ? above : below, lowest), bounds.y()));
+}
+
+void KSCombobox::choose(const QModelIndex& index)
+{
+    const int row = index.row();
+    hidePopup();
+    setCurrentIndex(row);
+    Q_EMIT textActivated(itemText(row));
+    Q_EMIT activated(row);
+}
+
+bool KSCombobox::eventFilter(QObject* obj, QEvent* event)
+{
+    if (obj == m_popup) {
+        return KeyEventFilter(obj, event) || handlePopupWidgetEvent(obj, event);
+    }
+    return QComboBox::eventFilter(obj, event);
+}
+
+bool KSCombobox::KeyEventFilter(QObject*, QEvent* event)
+{
+    if (event->type() != QEvent::KeyPress) {
+        return false;
+    }
+    const QModelIndex current = m_view->currentIndex();
+    switch (static_cast<QKeyEvent*>(event)->key()) {
+    case Qt::Key_Escape:
+        hidePopup();
+        break;
+    case Qt::Key_Return:
+    case Qt::Key_Enter:
+        if (current.isValid() && (current.flags() & Qt::ItemIsEnabled)) {
+            choose(current);
+        }
+        break;
+    case Qt::Key_Up:
+    case Qt::Key_Down: {
+        const int step = static_cast<QKeyEvent*>(event)->key() == Qt::Key_Up ? -1 : 1;
+        const QModelIndex next = current.siblingAtRow(current.row() + step);
+        if (next.isValid()) {
+            m_view->setCurrentIndex(next);
+        }
+        break;
+    }
+    default:
+        break;
+    }
+    return true;
+}
+
+bool KSCombobox::handlePopupWidgetEvent(QObject*, QEvent* event)
+{
+    switch (event->type()) {
+    case QEvent::Paint:
+        drawPopListTranslucent(m_popup);
+        return true;
+    case QEvent::Hide:
+        popupHidden();
+        return false;
+    // On the frame, beside the rows.
+    case QEvent::MouseButtonPress:
+    case QEvent::MouseButtonRelease:
+    case QEvent::MouseMove:
+        return true;
+    default:
+        return false;
+    }
+}
+
+void KSCombobox::drawPopListTranslucent(QWidget* popup)
+{
+    static const QStringList paths = SliceFrame::family(QStringLiteral(":/Dialog/Dialog_base_"));
+    QPainter painter(popup);
+    painter.setCompositionMode(QPainter::CompositionMode_Source);
+    painter.fillRect(popup->rect(), Qt::transparent);
+    painter.setCompositionMode(QPainter::CompositionMode_SourceOver);
+    SliceFrame(paths).paint(painter, popup->rect());
+}
+
+bool KSCombobox::event(QEvent* event)
+{
+    switch (static_cast<int>(event->type())) {
+    case QEvent::TouchBegin:
+    case QEvent::TouchUpdate:
+    case QEvent::TouchEnd:
+        return onTouchEvent(static_cast<QTouchEvent*>(event));
+    case QEvent::TouchCancel:
+        m_touching = false;
+        setPressed(false);
+        return true;
+    case KSEventProcessLockObject::RestoreOriginalType:
+        hidePopup();
+        return true;
+    default:
+        return QComboBox::event(event);
+    }
+}
+
+bool KSCombobox::onTouchEvent(QTouchEvent* event)
+{
+    if (!QWidget::isEnabled() || event->points().isEmpty()) {
+        return true;
+    }
+    if (event->type() == QEvent::TouchBegin) {
+        if (!m_touching) {
+            m_touching = true;
+            m_touchId = event->points().constFirst().id();
+            sendMouse(QEvent::MouseButtonPress, event->points().constFirst().position(),
+                      event->points().constFirst().globalPosition());
+        }
+        return true;
+    }
+    const bool end = event->type() == QEvent::TouchEnd;
+    for (const QEventPoint& point : event->points()) {
+        if (!m_touching || point.id() != m_touchId) {
+            continue;
+        }
+        const bool lifted = end || point.state() == QEventPoint::State::Released;
+        m_touching = !lifted;
+        sendMouse(lifted ? QEvent::MouseButtonRelease : QEvent::MouseMove, point.position(),
+                  point.globalPosition());
+        break;
+    }
+    if (end && m_touching) {
+        m_touching = false; // its own point was lost
+        setPressed(false);
+    }
+    return true;
+}
+
+void KSCombobox::sendMouse(QEvent::Type type, const QPointF& position, const QPointF& globalPosition)
+{
+    const Qt::MouseButtons held = type == QEvent::MouseButtonRelease ? Qt::NoButton : Qt::LeftButton;
+    QMouseEvent event(type, position.toPoint(), globalPosition.toPoint(),
+                      type == QEvent::MouseMove ? Qt::NoButton : Qt::LeftButton, held, Qt::NoModifier);
+    QLineEdit* edit = lineEdit();
+    if (edit != nullptr && edit->geometry().contains(position.toPoint())) {
+        QMouseEvent inEdit(type, edit->mapFrom(this, position.toPoint()), globalPosition.toPoint(),
+                           event.button(), held, Qt::NoModifier);
+        QCoreApplication::sendEvent(edit, &inEdit);
+    } else if (type == QEvent::MouseButtonPress) {
+        mousePressEvent(&event);
+    } else if (type == QEvent::MouseMove) {
+        mouseMoveEvent(&event);
+    } else {
+        mouseReleaseEvent(&event);
+    }
+}
+
+void KSCombobox::mousePressEvent(QMouseEvent* event)
+{
+    setPressed(event->button() == Qt::LeftButton);
+    QComboBox::mousePressEvent(event);
+}
+
+void KSCombobox::mouseReleaseEvent(QMouseEvent* event)
+{
+    setPressed(false);
+    QComboBox::mouseReleaseEvent(event);
+}
+
+void KSCombobox::setPressed(bool pressed)
+{
+    if (m_pressed != pressed) {
+        m_pressed = pressed;
+        update();
+    }
+}
+
+void KSCombobox::changeEvent(QEvent* event)
+{
+    if (event->type() == QEvent::EnabledChange && !QWidget::isEnabled()) {
+        m_touching = false;
+        setPressed(false);
+        hidePopup();
+    }
+    QComboBox::changeEvent(event);
+}
+
+void KSCombobox::moveEvent(QMoveEvent* event)
+{
+    QComboBox::moveEvent(event);
+    if (m_popup != nullptr && m_popup->isVisible()) {
+        adjustPopupListPostion();
+    }
+}
+
+void KSCombobox::paintEvent(QPaintEvent*)
+{
+    QPainter painter(this);
+    painter.setRenderHint(QPainter::SmoothPixmapTransform);
+    const bool enabled = QWidget::isEnabled();
+    const Slices* slices = &m_rest;
+    if (!enabled && !m_disabledSlices[1].isNull()) {
+        slices = &m_disabledSlices;
+    } else if (m_pressed && !m_pressedSlices[1].isNull()) {
+        slices = &m_pressedSlices;
+    }
+    const NineSlice::Triple cells = NineSlice::row(rect(), (*slices)[0].width(), (*slices)[2].width());
+    for (std::size_t i = 0; i < cells.size(); ++i) {
+        if (!(*slices)[i].isNull() && !cells[i].isEmpty()) {
+            painter.drawPixmap(cells[i], (*slices)[i]);
+        }
+    }
+    if (isEditable() || currentIndex() < 0) {
+        return;
+    }
+    const QRect area = rect().adjusted(TEXT_MARGIN, 0, -qMax((*slices)[2].width(), TEXT_MARGIN), 0);
+    const QModelIndex index = model()->index(currentIndex(), modelColumn(), rootModelIndex());
+    if (m_delegate->colorPallete() && CustomComboBoxDelegate::rowColor(index).isValid()) {
+        painter.fillRect(area.adjusted(0, TEXT_MARGIN, 0, -TEXT_MARGIN),
+                         CustomComboBoxDelegate::rowColor(index));
+        return;
+    }
+    painter.setFont(font());
+    painter.setPen(enabled ? TEXT_COLOR : DISABLED_COLOR);
+    painter.drawText(area, Qt::AlignLeft | Qt::AlignVCenter | Qt::TextSingleLine,
+                     painter.fontMetrics().elidedText(currentText(), Qt::ElideRight, area.width()));
+}

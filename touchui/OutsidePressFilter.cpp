@@ -1,0 +1,101 @@
+#include "touchui/OutsidePressFilter.h"
+
+#include <QCoreApplication>
+#include <QMouseEvent>
+#include <QTouchEvent>
+#include <QWidget>
+
+OutsidePressFilter::OutsidePressFilter(QWidget* window, QObject* parent) : QObject(parent), m_window(window)
+{
+}
+
+void OutsidePressFilter::start()
+{
+    m_watching = true;
+    // Anew each time: the filter that was installed last is asked first.
+    QCoreApplication::instance()->installEventFilter(this);
+    m_installed = true;
+}
+
+void OutsidePressFilter::stop()
+{
+    m_watching = false;
+    if (!m_swallowsTouch && !m_swallowsMouse && m_installed) {
+        QCoreApplication::instance()->removeEventFilter(this);
+        m_installed = false;
+    }
+}
+
+bool OutsidePressFilter::eventFilter(QObject* obj, QEvent* event)
+{
+    switch (event->type()) {
+    case QEvent::MouseButtonPress:
+    case QEvent::MouseButtonDblClick:
+    case QEvent::TouchBegin:
+        return obj->isWidgetType() && swallowPress(obj, event);
+    case QEvent::MouseMove:
+        return m_swallowsMouse && obj == m_swallowed;
+    case QEvent::TouchUpdate:
+        return m_swallowsTouch && obj == m_swallowed;
+    case QEvent::MouseButtonRelease:
+        if (!m_swallowsMouse || obj != m_swallowed) {
+            return false;
+        }
+        endSwallowing();
+        return true;
+    case QEvent::TouchEnd:
+    case QEvent::TouchCancel:
+        if (!m_swallowsTouch || obj != m_swallowed) {
+            return false;
+        }
+        endSwallowing();
+        return true;
+    default:
+        return false;
+    }
+}
+
+bool OutsidePressFilter::swallowPress(QObject* obj, QEvent* event)
+{
+    if (m_swallowsTouch || m_swallowsMouse) {
+        endSwallowing(); // whatever was swallowed has been lifted unseen
+    }
+    if (!m_watching || !isOutside(event)) {
+        return false;
+    }
+    const bool touch = event->type() == QEvent::TouchBegin;
+    m_swallowsTouch = touch;
+    m_swallowsMouse = !touch;
+    m_swallowed = obj;
+    event->accept(); // or its end would not come
+    Q_EMIT pressedOutside();
+    return true;
+}
+
+bool OutsidePressFilter::isOutside(QEvent* event) const
+{
+    if (m_window == nullptr) {
+        return false;
+    }
+    QPointF position;
+    if (event->type() == QEvent::TouchBegin) {
+        const auto* touch = static_cast<QTouchEvent*>(event);
+        if (touch->points().isEmpty()) {
+            return false;
+        }
+        position = touch->points().constFirst().globalPosition();
+    } else {
+        position = static_cast<QMouseEvent*>(event)->globalPosition();
+    }
+    return !m_window->geometry().contains(position.toPoint());
+}
+
+void OutsidePressFilter::endSwallowing()
+{
+    m_swallowsTouch = false;
+    m_swallowsMouse = false;
+    m_swallowed.clear();
+    if (!m_watching) {
+        stop();
+    }
+}

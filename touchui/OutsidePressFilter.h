@@ -1,0 +1,42 @@
+#pragma once
+
+#include <QObject>
+#include <QPointer>
+
+class QEvent;
+class QWidget;
+
+// Closes what is open for the moment: tells of the first press or touch of this process outside a window, and
+// swallows that press and all that follows from it up to the lift, so that it presses nothing else.
+//
+// Such windows are of the type Qt::ToolTip and not Qt::Popup: while a popup is open, Qt delivers no touches,
+// and the finger that opened it would never be lifted for the widget under it.
+class OutsidePressFilter : public QObject
+{
+    Q_OBJECT
+public:
+    // window is not owned and may go first. GUI thread only.
+    explicit OutsidePressFilter(QWidget* window, QObject* parent = nullptr);
+
+    // Between these the presses are watched. A press that is being swallowed is swallowed to its end.
+    void start();
+    void stop();
+    bool isWatching() const { return m_watching; }
+
+    bool eventFilter(QObject* obj, QEvent* event) override;
+
+Q_SIGNALS:
+    void pressedOutside();
+
+private:
+    bool isOutside(QEvent* event) const;
+    bool swallowPress(QObject* obj, QEvent* event);
+    void endSwallowing();
+
+    QPointer<QWidget> m_window;
+    bool m_watching = false;
+    bool m_installed = false;
+    bool m_swallowsTouch = false;
+    bool m_swallowsMouse = false;
+    QPointer<QObject> m_swallowed; // the object that the press is kept from
+};

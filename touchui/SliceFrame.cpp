@@ -1,0 +1,58 @@
+#include "touchui/SliceFrame.h"
+
+#include <QPainter>
+
+#include <algorithm>
+
+SliceFrame::SliceFrame(const QStringList& paths)
+{
+    if (paths.size() != NineSlice::PieceCount) {
+        return;
+    }
+    for (int i = 0; i < NineSlice::PieceCount; ++i) {
+        m_pieces[i].load(paths.at(i));
+    }
+}
+
+QStringList SliceFrame::family(const QString& prefix, const QString& bottom)
+{
+    QStringList paths;
+    for (const QString& line : {QStringLiteral("Upper"), QStringLiteral("Middle"), bottom}) {
+        for (const char* column : {"_Left", "_Center", "_Right"}) {
+            paths.append(prefix + line + QLatin1String(column));
+        }
+    }
+    return paths;
+}
+
+void SliceFrame::paint(QPainter& painter, const QRect& target) const
+{
+    const NineSlice::Cells cells = NineSlice::cells(target, corners());
+    for (int i = 0; i < NineSlice::PieceCount; ++i) {
+        paintPiece(painter, static_cast<NineSlice::Piece>(i), cells[i]);
+    }
+}
+
+void SliceFrame::paintPiece(QPainter& painter, NineSlice::Piece piece, const QRect& target) const
+{
+    const QPixmap& picture = m_pieces[piece];
+    if (picture.isNull() || target.isEmpty()) {
+        return;
+    }
+    const bool smooth = painter.testRenderHint(QPainter::SmoothPixmapTransform);
+    painter.setRenderHint(QPainter::SmoothPixmapTransform, picture.size() != target.size());
+    painter.drawPixmap(target, picture);
+    painter.setRenderHint(QPainter::SmoothPixmapTransform, smooth);
+}
+
+QMargins SliceFrame::corners() const
+{
+    return QMargins(m_pieces[NineSlice::UpperLeft].width(), m_pieces[NineSlice::UpperLeft].height(),
+                    m_pieces[NineSlice::UpperRight].width(), m_pieces[NineSlice::BottomLeft].height());
+}
+
+bool SliceFrame::isNull() const
+{
+    return std::all_of(m_pieces.begin(), m_pieces.end(),
+                       [](const QPixmap& picture) { return picture.isNull(); });
+}
