@@ -94,8 +94,8 @@ void treeSign(QPainter& painter, bool isOpen, State state)
                                                    : Tokens::TEXT;
     Icons::begin(painter, color);
     painter.setBrush(color);
-    painter.drawPolygon(isOpen ? QPolygonF({QPointF(10, 14), QPointF(26, 14), QPointF(18, 23)})
-                               : QPolygonF({QPointF(14, 10), QPointF(23, 18), QPointF(14, 26)}));
+    painter.drawPolygon(isOpen ? QPolygonF({QPointF(8, 13), QPointF(28, 13), QPointF(18, 25)})
+                               : QPolygonF({QPointF(13, 8), QPointF(25, 18), QPointF(13, 28)}));
 }
 
 void recordingSign(QPainter& painter)

@@ -50,9 +50,7 @@ void Surfaces::drawFace(QPainter& painter, const QSize& size, const Face& face, 
     painter.setBrush(gradient);
     painter.drawRoundedRect(insideLine(size, face.border / 2), radius, radius);
     if (face.light.isValid()) {
-        painter.setPen(QPen(face.light, Tokens::BORDER));
-        painter.drawLine(QPointF(radius, face.border + 0.5),
-                         QPointF(size.width() - radius, face.border + 0.5));
+        painter.fillRect(QRectF(radius, face.border, size.width() - 2 * radius, Tokens::BORDER), face.light);
     }
 }
 

@@ -1,0 +1,959 @@
+// A finger's life on a list: tap, hold, scroll, flick, brake, lift and drop, with others beside it.
+#include "ScrollViewerFixture.h"
+
+#include "touchui/KSScrollBar.h"
+
+#include <QSignalSpy>
+#include <QWheelEvent>
+
+using Names = QStringList;
+
+class TestScrollViewer : public QObject
+{
+    Q_OBJECT
+private Q_SLOTS:
+    void initTestCase();
+    void init();
+    void cleanup();
+
+    void tap();
+    void tapInTheGapBelongsToTheRowAbove();
+    void tapBelowTheLastRow();
+    void tapBesideTheRowsSaysNothing();
+    void hold();
+    void holdInRealTime();
+    void holdInEmptyArea();
+    void slopOfTheFinger_data();
+    void slopOfTheFinger();
+    void slopOfTheMouse_data();
+    void slopOfTheMouse();
+    void rightPress();
+    void scrollFollowsTheFinger();
+    void fiveFirstPixelsAreNoFlick();
+    void flickGlidesAndRests();
+    void flickDiesAtTheEnd();
+    void quickFlickTapsNothing();
+    void brakeTapsNothing();
+    void boundedDragDoesNotRunOn();
+    void leavingTheRowEndsThePress();
+    void switchedOffItDoesNotFollow();
+    void takenTouchGoesToTheRow();
+    void mouseDragScrolls();
+    void mouseKeepsTheRowInside();
+
+    void liftAndDrop();
+    void dropAtTheEnd();
+    void dropAtTheSamePlace();
+    void dropAtEdgeScrollsDown();
+    void edgeScrollingFasterFarOut();
+    void edgeScrollingStopsInside();
+    void cloneJumpsAside();
+    void rowWithoutCloneFloatsItself();
+    void handleReleasedEarlyIsATap();
+    void pressBesideTheHandleLiftsNothing();
+    void startMoveOfTheRowLifts();
+    void switchingOffDropsTheRow();
+    void othersAreDeafWhileDragging();
+    void addingWhileDraggingKeepsThePlace();
+    void removingTheLiftedRow();
+    void clearingWhileDragging();
+    void deletedWhileDragging();
+    void mouseLiftsAndDrops();
+
+    void secondFingerOnAnotherRow();
+    void secondFingerOnTheSameRow();
+    void firstFingerLiftedFirst();
+    void cancelledTap();
+    void cancelledDrag();
+    void hidingEndsThePress();
+    void clearedUnderTheFinger();
+    void remoteLockMidTouch();
+    void timersCanStartAnew();
+    void stretchTimerAligns();
+    void barUnderTheFinger();
+    void pressOnTheBarBrakes();
+
+private:
+    void lift(int row);
+
+    QPointingDevice* m_device = nullptr;
+    QPointingDevice* m_other = nullptr; // a second screen
+    std::unique_ptr<ScrollViewerFixture> m;
+};
+
+void TestScrollViewer::initTestCase()
+{
+    m_device = QTest::createTouchDevice();
+    m_device->setParent(this);
+    m_other = QTest::createTouchDevice();
+    m_other->setParent(this);
+}
+
+void TestScrollViewer::init()
+{
+    m = std::make_unique<ScrollViewerFixture>(m_device);
+}
+
+void TestScrollViewer::cleanup()
+{
+    const bool locked = !m->mFilter.activateLockObjects().isEmpty();
+    m.reset();
+    QVERIFY2(!locked, "a touch lock is left");
+}
+
+// With a finger on the row's handle until it is off the list.
+void TestScrollViewer::lift(int row)
+{
+    m->mList->setItemsDragFlagAlignment(DRAGFLAG_LEFT);
+    m->fill(20);
+    m->mList->slotItemsCanDrag(true);
+    m->press(50, row * ScrollViewerFixture::ROW + 50);
+    m->clock.advance(50);
+    QVERIFY(m->mList->isDragging());
+    QCOMPARE(m->takeLog(), Names{QStringLiteral("lifted %1").arg(row)});
+    QCOMPARE(m->mList->count(), 19);
+}
+
+void TestScrollViewer::tap()
+{
+    m->fill(20);
+    m->press(100, 150);
+    QCOMPARE(m->takeLog(), Names{"pressed 1"});
+    QVERIFY(!m->mFilter.activateLockObjects().isEmpty());
+    m->release(100, 150);
+    QCOMPARE(m->takeLog(), (Names{"released 1", "clicked 1"}));
+    m->clock.advance(2000);
+    QCOMPARE(m->takeLog(), Names());
+    QCOMPARE(m->clock.running(), 0);
+    QCOMPARE(m->value(), 0);
+}
+
+void TestScrollViewer::tapInTheGapBelongsToTheRowAbove()
+{
+    m->fill(20);
+    m->press(100, 102);
+    QCOMPARE(m->takeLog(), Names{"pressed 0"});
+    m->release(100, 102);
+    // The press is the row's, but the finger is on no row.
+    QCOMPARE(m->takeLog(), Names());
+}
+
+void TestScrollViewer::tapBelowTheLastRow()
+{
+    m->fill(2);
+    m->press(100, 400);
+    m->release(100, 400);
+    QCOMPARE(m->takeLog(), (Names{"pressed -", "released -"}));
+}
+
+void TestScrollViewer::tapBesideTheRowsSaysNothing()
+{
+    m->fill(20);
+    m->mList->setHEffectiveArea(200, 200);
+    m->press(150, 150);
+    m->clock.advance(800);
+    m->release(150, 150);
+    QCOMPARE(m->takeLog(), Names());
+    // But the list can be flicked from there.
+    m->press(150, 400);
+    m->drag(150, 400, 200, 10);
+    QVERIFY(m->value() > 100);
+    m->release(150, 200);
+    QCOMPARE(m->takeLog(), Names());
+    m->tap(200, 150);
+    m->takeLog();
+    m->clock.advance(40000);
+    m->tap(200, 150);
+    QCOMPARE(m->takeLog().size(), 3);
+}
+
+void TestScrollViewer::hold()
+{
+    m->fill(20);
+    m->press(100, 150);
+    m->takeLog();
+    m->clock.advance(699);
+    QCOMPARE(m->takeLog(), Names());
+    m->clock.advance(1);
+    QCOMPARE(m->takeLog(), Names{"held 1"});
+    m->clock.advance(5000);
+    m->release(100, 150);
+    QCOMPARE(m->takeLog(), (Names{"released 1", "clicked 1"}));
+}
+
+void TestScrollViewer::holdInRealTime()
+{
+    TouchClock::setInstance(nullptr);
+    m->fill(20);
+    m->press(100, 150);
+    m->takeLog();
+    QTRY_COMPARE_WITH_TIMEOUT(m->log, Names{"held 1"}, 3000);
+    m->release(100, 150);
+}
+
+void TestScrollViewer::holdInEmptyArea()
+{
+    m->press(100, 150);
+    m->clock.advance(700);
+    m->release(100, 150);
+    QCOMPARE(m->takeLog(), (Names{"pressed -", "held -", "released -"}));
+}
+
+void TestScrollViewer::slopOfTheFinger_data()
+{
+    QTest::addColumn<QPoint>("way");
+    QTest::addColumn<bool>("held");
+    QTest::newRow("20 right") << QPoint(20, 0) << true;
+    QTest::newRow("21 right") << QPoint(21, 0) << false;
+    QTest::newRow("10 and 10") << QPoint(10, -10) << true;
+    QTest::newRow("10 and 11") << QPoint(10, -11) << false;
+    QTest::newRow("20 up") << QPoint(0, -20) << true;
+    QTest::newRow("21 down") << QPoint(0, 21) << false;
+}
+
+void TestScrollViewer::slopOfTheFinger()
+{
+    QFETCH(QPoint, way);
+    QFETCH(bool, held);
+    m->fill(20);
+    m->press(100, 150);
+    m->move(100 + way.x(), 150 + way.y());
+    m->takeLog();
+    m->clock.advance(800);
+    QCOMPARE(m->takeLog(), held ? Names{"held 1"} : Names());
+    m->release(100 + way.x(), 150 + way.y());
+}
+
+void TestScrollViewer::slopOfTheMouse_data()
+{
+    QTest::addColumn<QPoint>("way");
+    QTest::addColumn<bool>("held");
+    QTest::newRow("5") << QPoint(5, 0) << true;
+    QTest::newRow("6") << QPoint(6, 0) << false;
+    QTest::newRow("3 and 2") << QPoint(3, 2) << true;
+    QTest::newRow("3 and 3") << QPoint(3, 3) << false;
+}
+
+void TestScrollViewer::slopOfTheMouse()
+{
+    QFETCH(QPoint, way);
+    QFETCH(bool, held);
+    m->fill(20);
+    QWidget* row = m->mList->getWidgetItem(1);
+    QTest::mousePress(row, Qt::LeftButton, Qt::NoModifier, QPoint(60, 50));
+    QTest::mouseMove(row, QPoint(60, 50) + way);
+    QCOMPARE(m->takeLog(), Names{"pressed 1"});
+    m->clock.advance(800);
+    QCOMPARE(m->takeLog(), held ? Names{"held 1"} : Names());
+    QTest::mouseRelease(row, Qt::LeftButton, Qt::NoModifier, QPoint(60, 50) + way);
+}
+
+void TestScrollViewer::rightPress()
+{
+    m->fill(2);
+    QTest::mouseClick(m->mList->getWidgetItem(1), Qt::RightButton);
+    m->clock.advance(800);
+    QCOMPARE(m->takeLog(), Names{"right 1"});
+    QTest::mouseClick(m->mList->viewport(), Qt::RightButton, Qt::NoModifier, QPoint(100, 450));
+    QCOMPARE(m->takeLog(), Names{"right -"});
+}
+
+void TestScrollViewer::scrollFollowsTheFinger()
+{
+    m->fill(20);
+    QSignalSpy visible(m->mList, &KSScrollViewerWidget::signalVisibleItemsChange);
+    m->press(100, 495);
+    m->move(100, 490); // where the motion starts
+    m->drag(100, 490, 190, 10);
+    m->clock.advance(33 * 8);
+    QVERIFY2(qAbs(m->value() - 300) <= 15, qPrintable(QString::number(m->value())));
+    QCOMPARE(m->mList->firstVisibleItem(), m->value() / ScrollViewerFixture::ROW);
+    QVERIFY(visible.count() >= 3);
+    m->takeLog();
+    // The finger has come to rest before it leaves.
+    m->release(100, 190);
+    QCOMPARE(m->takeLog(), Names{"colour 4"});
+    const int rest = m->value();
+    m->clock.advance(5000);
+    QCOMPARE(m->value(), rest);
+    QCOMPARE(m->clock.running(), 0);
+}
+
+void TestScrollViewer::fiveFirstPixelsAreNoFlick()
+{
+    m->fill(20);
+    m->press(100, 150);
+    m->move(100, 150);
+    m->move(100, 145);
+    m->clock.advance(330);
+    QCOMPARE(m->value(), 0);
+    QVERIFY(!m->mList->hasFlicked());
+    m->release(100, 145);
+    QCOMPARE(m->takeLog(), (Names{"pressed 1", "released 1", "clicked 1"}));
+    QVERIFY(!m->mList->isAutoFilck());
+}
+
+void TestScrollViewer::flickGlidesAndRests()
+{
+    m->fill(60);
+    m->press(100, 400);
+    m->drag(100, 400, 340, 3);
+    m->move(100, 300);
+    m->release(100, 300);
+    QVERIFY(m->mList->isAutoFilck());
+    int last = m->value();
+    int step = 0;
+    int ticks = 0;
+    for (; m->mList->isAutoFilck() && ticks < 1000; ++ticks) {
+        m->clock.advance(33);
+        const int now = m->value() - last;
+        QVERIFY2(now <= step || ticks == 0, "the flick speeds up");
+        QVERIFY(now >= 0);
+        step = now;
+        last = m->value();
+    }
+    QVERIFY(ticks > 10 && ticks < 300);
+    QVERIFY(m->value() > 100);
+    QCOMPARE(m->clock.running(), 0);
+    QCOMPARE(m->takeLog().size(), 2); // pressed, colour
+}
+
+void TestScrollViewer::flickDiesAtTheEnd()
+{
+    m->fill(7);
+    const int end = m->maximum();
+    QVERIFY(end > 0);
+    m->press(100, 450);
+    m->drag(100, 450, 400, 3);
+    m->move(100, 50);
+    m->release(100, 50);
+    QVERIFY(m->mList->isAutoFilck());
+    m->clock.advance(33 * 3);
+    QCOMPARE(m->value(), end);
+    QVERIFY(!m->mList->isAutoFilck());
+    QCOMPARE(m->clock.running(), 0);
+    // And at the start.
+    m->press(100, 50);
+    m->drag(100, 50, 100, 3);
+    m->move(100, 450);
+    m->release(100, 450);
+    m->clock.advance(33 * 3);
+    QCOMPARE(m->value(), 0);
+    QCOMPARE(m->clock.running(), 0);
+}
+
+void TestScrollViewer::quickFlickTapsNothing()
+{
+    m->fill(40);
+    m->press(100, 250);
+    m->move(100, 249);
+    m->move(100, 215);
+    m->release(100, 212); // all within one tick, and still on the row
+    QCOMPARE(m->takeLog(), (Names{"pressed 2", "colour 2"}));
+    m->clock.advance(330);
+    QVERIFY(m->value() > 10);
+}
+
+void TestScrollViewer::brakeTapsNothing()
+{
+    m->fill(60);
+    m->press(100, 400);
+    m->drag(100, 400, 340, 3);
+    m->move(100, 100);
+    m->release(100, 100);
+    m->clock.advance(99);
+    QVERIFY(m->mList->isAutoFilck());
+    m->takeLog();
+    m->press(100, 250);
+    QVERIFY(!m->mList->isAutoFilck());
+    const int braked = m->value();
+    m->clock.advance(2000); // nor does it become a hold
+    m->release(100, 250);
+    QCOMPARE(m->value(), braked);
+    QCOMPARE(m->takeLog(), Names());
+    // The next one is a tap again.
+    m->tap(100, 250);
+    QCOMPARE(m->takeLog().size(), 3);
+}
+
+void TestScrollViewer::boundedDragDoesNotRunOn()
+{
+    m->fill(60);
+    m->press(100, 250);
+    m->move(100, 249);
+    // Far above the list: the row under the finger stops at its upper edge.
+    for (int i = 0; i < 30; ++i) {
+        m->move(100, -300);
+        m->clock.advance(33);
+    }
+    const int top = m->mList->getWidgetItem(2)->mapTo(m->mList, QPoint()).y();
+    QVERIFY2(top >= 0 && top <= 1, qPrintable(QString::number(top)));
+    m->release(100, -300);
+    QVERIFY(!m->mList->isAutoFilck());
+    const int rest = m->value();
+    m->clock.advance(3000);
+    QCOMPARE(m->value(), rest);
+}
+
+void TestScrollViewer::leavingTheRowEndsThePress()
+{
+    m->fill(3); // too few to scroll
+    m->press(100, 150);
+    m->move(100, 240);
+    m->release(100, 150);
+    QCOMPARE(m->takeLog(), Names{"pressed 1"});
+}
+
+void TestScrollViewer::switchedOffItDoesNotFollow()
+{
+    m->fill(20);
+    m->press(100, 400);
+    m->move(100, 390);
+    m->mList->setFlickAbility(false);
+    m->drag(100, 390, 100, 10);
+    m->release(100, 100);
+    QCOMPARE(m->value(), 0);
+    QVERIFY(!m->mList->isAutoFilck());
+    m->takeLog();
+    m->tap(100, 150); // on again, and nothing to brake
+    QCOMPARE(m->takeLog(), (Names{"pressed 1", "released 1", "clicked 1"}));
+}
+
+void TestScrollViewer::takenTouchGoesToTheRow()
+{
+    m->fill(20);
+    m->mList->setIsTake(true);
+    QSignalSpy down(m->mList->getWidgetItem(1), &QAbstractButton::pressed);
+    m->press(100, 150);
+    QCOMPARE(down.count(), 1);
+    m->drag(100, 150, 50, 5);
+    QCOMPARE(m->value(), 0);
+    m->release(100, 50);
+    m->mList->setIsTake(false);
+}
+
+void TestScrollViewer::mouseDragScrolls()
+{
+    m->fill(20);
+    QWidget* viewport = m->mList->viewport();
+    QTest::mousePress(m->mList->getWidgetItem(3), Qt::LeftButton, Qt::NoModifier, QPoint(60, 50));
+    for (int y = 360; y >= 160; y -= 20)
+        QTest::mouseMove(viewport, QPoint(100, y));
+    QTest::mouseRelease(viewport, Qt::LeftButton, Qt::NoModifier, QPoint(100, 160));
+    QCOMPARE(m->takeLog(), (Names{"pressed 3", "colour 3"}));
+    QCOMPARE(m->value(), 362 - 160);
+    m->clock.advance(2000);
+    QCOMPARE(m->value(), 362 - 160); // no flick
+}
+
+void TestScrollViewer::mouseKeepsTheRowInside()
+{
+    m->fill(20);
+    QWidget* viewport = m->mList->viewport();
+    QTest::mousePress(m->mList->getWidgetItem(3), Qt::LeftButton, Qt::NoModifier, QPoint(60, 50));
+    for (int y = 360; y >= -400; y -= 20)
+        QTest::mouseMove(viewport, QPoint(100, y));
+    QCOMPARE(m->value(), 3 * ScrollViewerFixture::ROW);
+    QTest::mouseRelease(viewport, Qt::LeftButton, Qt::NoModifier, QPoint(100, -400));
+}
+
+void TestScrollViewer::liftAndDrop()
+{
+    lift(1);
+    const KSBaseItemWidget* clone = m->mList->getMoveItem();
+    QVERIFY(clone && clone->isPopup() && clone->isVisible());
+    QCOMPARE(clone->parentWidget(), &m->mWindow);
+    QCOMPARE(QWidget::mouseGrabber(), m->mList->viewport());
+    const int x = clone->x();
+    for (int y = 154; y <= 360; y += 10)
+        m->move(70, y);
+    QCOMPARE(clone->x(), x); // it moves up and down only
+    QCOMPARE(m->value(), 0); // and the list stays
+    m->release(70, 360);
+    QCOMPARE(m->takeLog().filter("dropped").size(), 1);
+    QCOMPARE(m->order().mid(0, 6), (Names{"0", "2", "3", "1", "4", "5"}));
+    QVERIFY(!m->mList->isDragging());
+    QVERIFY(!m->mList->getMoveItem());
+    QVERIFY(!QWidget::mouseGrabber());
+    QVERIFY(m->mList->getWidgetItem(3)->isVisible());
+    QVERIFY(!m->mList->getWidgetItem(3)->isPopup());
+    QVERIFY(m->mList->getWidgetItem(3)->hasDragFlag());
+    QCOMPARE(m->mList->getWidgetItem(3)->y(), 3 * ScrollViewerFixture::ROW);
+    QVERIFY(clone->isHidden());
+    QCOMPARE(m->clock.running(), 0);
+    m->takeLog();
+    m->tap(100, 150);
+    QCOMPARE(m->takeLog().first(), QStringLiteral("pressed 2"));
+}
+
+void TestScrollViewer::dropAtTheEnd()
+{
+    m->mList->setItemsDragFlagAlignment(DRAGFLAG_LEFT);
+    m->fill(4);
+    m->mList->slotItemsCanDrag(true);
+    m->press(50, 50);
+    m->clock.advance(50);
+    m->move(50, 100);
+    m->move(50, 440);
+    m->release(50, 440);
+    QCOMPARE(m->order(), (Names{"1", "2", "3", "0"}));
+    // And back to the start.
+    m->press(50, 3 * ScrollViewerFixture::ROW + 50);
+    m->clock.advance(50);
+    m->move(50, 200);
+    m->move(50, 20);
+    m->release(50, 20);
+    QCOMPARE(m->order(), (Names{"0", "1", "2", "3"}));
+}
+
+void TestScrollViewer::dropAtTheSamePlace()
+{
+    lift(2);
+    m->move(50, 270);
+    m->release(50, 270);
+    QCOMPARE(m->order().mid(0, 4), (Names{"0", "1", "2", "3"}));
+    QCOMPARE(m->takeLog().filter("dropped").size(), 1);
+}
+
+void TestScrollViewer::dropAtEdgeScrollsDown()
+{
+    lift(2);
+    m->move(50, 300);
+    m->move(50, 470); // the clone hangs over the lower edge
+    m->clock.advance(40 * 200);
+    QCOMPARE(m->value(), m->maximum());
+    m->move(50, 480);
+    m->release(50, 480);
+    QCOMPARE(m->order().constLast(), QStringLiteral("2"));
+    QCOMPARE(m->value(), m->maximum());
+    QCOMPARE(m->clock.running(), 0);
+    m->takeLog();
+    // Up again.
+    m->press(50, 450);
+    m->clock.advance(50);
+    QCOMPARE(m->takeLog(), Names{"lifted 2"});
+    m->move(50, 300);
+    m->move(50, -40);
+    m->clock.advance(40 * 200);
+    QCOMPARE(m->value(), 0);
+    m->release(50, -40);
+    QCOMPARE(m->order().constFirst(), QStringLiteral("2"));
+    QCOMPARE(m->order().size(), 20);
+}
+
+void TestScrollViewer::edgeScrollingFasterFarOut()
+{
+    lift(2);
+    const int height = ScrollViewerFixture::HEIGHT;
+    const auto hang = [&](int overhang) { // by so much
+        const KSBaseItemWidget* clone = m->mList->getMoveItem();
+        const int bottom = clone->mapTo(&m->mWindow, QPoint(0, clone->height())).y() - m->mList->y();
+        static int finger = 258;
+        finger += overhang - (bottom - height);
+        m->move(50, finger);
+    };
+    m->move(50, 258);
+    hang(10);
+    m->clock.advance(40);
+    QCOMPARE(m->value(), 10);
+    hang(30);
+    m->clock.advance(40);
+    QCOMPARE(m->value(), 20);
+    hang(31);
+    m->clock.advance(40);
+    QCOMPARE(m->value(), 50);
+    hang(9);
+    m->clock.advance(400);
+    QCOMPARE(m->value(), 50);
+    m->release(50, 400);
+}
+
+void TestScrollViewer::edgeScrollingStopsInside()
+{
+    lift(2);
+    m->move(50, 470);
+    m->clock.advance(400);
+    const int value = m->value();
+    QVERIFY(value > 0);
+    m->move(50, 250);
+    m->clock.advance(400);
+    QCOMPARE(m->value(), value);
+    m->release(50, 250);
+}
+
+void TestScrollViewer::cloneJumpsAside()
+{
+    lift(1);
+    // 20 to the left and 20 down of where the row was, for a handle on the left.
+    QCOMPARE(m->mList->getMoveItem()->pos(), QPoint(100 + 38 - 20, 100 + ScrollViewerFixture::ROW + 20));
+    m->release(50, 154);
+    for (int i = 0; i < m->mList->count(); ++i)
+        m->mList->getWidgetItem(i)->setDragFlagAlignment(DRAGFLAG_RIGHT);
+    m->press(390, 154);
+    m->clock.advance(50);
+    QCOMPARE(m->mList->getMoveItem()->pos(), QPoint(100 + 38 + 20, 100 + ScrollViewerFixture::ROW + 20));
+    m->release(390, 154);
+}
+
+void TestScrollViewer::rowWithoutCloneFloatsItself()
+{
+    m->mList->setItemsDragFlagAlignment(DRAGFLAG_LEFT);
+    m->fill(5, false);
+    m->mList->slotItemsCanDrag(true);
+    KSBaseItemWidget* row = m->mList->getWidgetItem(1);
+    m->press(50, 154);
+    m->clock.advance(50);
+    QCOMPARE(m->mList->getMoveItem(), row);
+    QVERIFY(row->isVisible());
+    m->move(50, 200);
+    m->move(50, 364);
+    m->release(50, 364);
+    QCOMPARE(m->order(), (Names{"0", "2", "3", "1", "4"}));
+    QVERIFY(row->isVisible());
+    m->press(50, 50);
+    m->clock.advance(50);
+    m->release(50, 50);
+    QCOMPARE(m->mList->getWidgetItem(3), row);
+}
+
+void TestScrollViewer::handleReleasedEarlyIsATap()
+{
+    m->mList->setItemsDragFlagAlignment(DRAGFLAG_RIGHT);
+    m->fill(5);
+    m->mList->slotItemsCanDrag(true);
+    m->press(390, 154);
+    m->clock.advance(49);
+    m->release(390, 154);
+    m->clock.advance(100);
+    QCOMPARE(m->takeLog(), (Names{"released 1", "clicked 1"}));
+    QVERIFY(!m->mList->isDragging());
+}
+
+void TestScrollViewer::pressBesideTheHandleLiftsNothing()
+{
+    m->mList->setItemsDragFlagAlignment(DRAGFLAG_LEFT);
+    m->fill(5);
+    m->mList->slotItemsCanDrag(true);
+    m->press(38 + 36, 154);
+    m->clock.advance(100);
+    QVERIFY(!m->mList->isDragging());
+    m->release(38 + 36, 154);
+    m->mList->slotItemsCanDrag(false);
+    m->press(50, 154);
+    m->clock.advance(100);
+    QVERIFY(!m->mList->isDragging());
+    m->release(50, 154);
+}
+
+void TestScrollViewer::startMoveOfTheRowLifts()
+{
+    m->fill(5);
+    m->press(200, 154);
+    m->takeLog();
+    KSBaseItemWidget* row = m->mList->getWidgetItem(1);
+    Q_EMIT row->signalStartMove(row);
+    QCOMPARE(m->takeLog(), Names{"lifted 1"});
+    m->clock.advance(800); // no hold
+    m->move(200, 160);
+    m->move(200, 364);
+    m->release(200, 364);
+    QCOMPARE(m->order(), (Names{"0", "2", "3", "1", "4"}));
+    QVERIFY(!row->hasDragFlag());
+    QVERIFY(!m->takeLog().contains("held 1"));
+}
+
+void TestScrollViewer::switchingOffDropsTheRow()
+{
+    lift(1);
+    m->move(50, 160);
+    m->move(50, 260);
+    m->mList->slotItemsCanDrag(false);
+    QVERIFY(!m->mList->isDragging());
+    QCOMPARE(m->mList->count(), 20);
+    for (int i = 0; i < 20; ++i)
+        QVERIFY(!m->mList->getWidgetItem(i)->hasDragFlag());
+    QCOMPARE(m->takeLog(), Names{"dropped"});
+    m->release(50, 260);
+    QCOMPARE(m->takeLog(), Names());
+}
+
+void TestScrollViewer::othersAreDeafWhileDragging()
+{
+    lift(1);
+    // Past the application's filter, which would refuse it for itself.
+    QCoreApplication::instance()->removeEventFilter(&m->mFilter);
+    auto other = QTest::touchEvent(&m->mWindow, m_other, false);
+    other.press(1, QPoint(200, 450), m->mList).commit();
+    other.move(1, QPoint(200, 200), m->mList).commit();
+    other.release(1, QPoint(200, 200), m->mList).commit();
+    QCoreApplication::instance()->installEventFilter(&m->mFilter);
+    QCOMPARE(m->takeLog(), Names());
+    QVERIFY(m->mList->isDragging());
+    m->release(50, 154);
+}
+
+void TestScrollViewer::addingWhileDraggingKeepsThePlace()
+{
+    lift(1);
+    m->mList->addWidgetItem(new Row(QStringLiteral("new")), 0);
+    m->mList->removeWidgetItem(m->mList->getWidgetItem(19));
+    QVERIFY(m->mList->isDragging());
+    m->release(50, 154);
+    QCOMPARE(m->mList->count(), 20);
+    QVERIFY(m->order().contains(QStringLiteral("1")));
+    QVERIFY(m->order().contains(QStringLiteral("new")));
+}
+
+void TestScrollViewer::removingTheLiftedRow()
+{
+    lift(1);
+    KSBaseItemWidget* row = m->mList->getMoveItem();
+    QVERIFY(row);
+    KSBaseItemWidget* lifted = m->mList->getSelectedItem();
+    m->mList->removeWidgetItem(lifted);
+    QVERIFY(!m->mList->isDragging());
+    QVERIFY(lifted->isHidden());
+    QCOMPARE(m->mList->count(), 19);
+    QVERIFY(!QWidget::mouseGrabber());
+    m->move(50, 300);
+    m->release(50, 300);
+    QCOMPARE(m->takeLog(), Names());
+    m->mList->addWidgetItem(lifted, 1);
+    QCOMPARE(m->order().mid(0, 3), (Names{"0", "1", "2"}));
+    QVERIFY(lifted->isVisible());
+}
+
+void TestScrollViewer::clearingWhileDragging()
+{
+    lift(1);
+    m->mList->removeAll();
+    QVERIFY(m->mList->isEmpty());
+    QVERIFY(!m->mList->isDragging());
+    m->move(50, 300);
+    m->release(50, 300);
+    QCOMPARE(m->maximum(), 0);
+    QCOMPARE(m->clock.running(), 0);
+    m->fill(3);
+    m->tap(100, 50);
+    QCOMPARE(m->takeLog(), (Names{"pressed 0", "released 0", "clicked 0"}));
+}
+
+void TestScrollViewer::deletedWhileDragging()
+{
+    lift(1);
+    delete m->mList->getSelectedItem();
+    delete m->mList->getWidgetItem(0);
+    QCOMPARE(m->mList->count(), 18);
+    m->move(50, 200);
+    m->clock.advance(100);
+    m->release(50, 200);
+    QVERIFY(!m->mList->isDragging());
+    QVERIFY(!m->mList->getMoveItem());
+    QCOMPARE(m->mList->count(), 18);
+    QCOMPARE(m->mList->getWidgetItem(0)->y(), 0);
+    m->mFilter.resetLock(); // nobody is left to let go
+}
+
+void TestScrollViewer::mouseLiftsAndDrops()
+{
+    m->mList->setItemsDragFlagAlignment(DRAGFLAG_LEFT);
+    m->fill(5);
+    m->mList->slotItemsCanDrag(true);
+    QWidget* viewport = m->mList->viewport();
+    QTest::mousePress(m->mList->getWidgetItem(1), Qt::LeftButton, Qt::NoModifier, QPoint(12, 50));
+    m->clock.advance(50);
+    QVERIFY(m->mList->isDragging());
+    QTest::mouseMove(viewport, QPoint(50, 200));
+    QTest::mouseMove(viewport, QPoint(50, 364));
+    QTest::mouseRelease(viewport, Qt::LeftButton, Qt::NoModifier, QPoint(50, 364));
+    QCOMPARE(m->order(), (Names{"0", "2", "3", "1", "4"}));
+}
+
+void TestScrollViewer::secondFingerOnAnotherRow()
+{
+    m->fill(20);
+    auto fingers = m->fingers();
+    fingers.press(0, QPoint(100, 50), m->mList).commit();
+    fingers.stationary(0).press(1, QPoint(300, 450), m->mList).commit();
+    fingers.stationary(0).move(1, QPoint(300, 100), m->mList).commit();
+    m->clock.advance(330);
+    QCOMPARE(m->value(), 0);
+    fingers.stationary(0).release(1, QPoint(300, 100), m->mList).commit();
+    fingers.release(0, QPoint(100, 50), m->mList).commit();
+    QCOMPARE(m->takeLog(), (Names{"pressed 0", "released 0", "clicked 0"}));
+}
+
+void TestScrollViewer::secondFingerOnTheSameRow()
+{
+    m->fill(20);
+    auto fingers = m->fingers();
+    fingers.press(0, QPoint(100, 50), m->mList).commit();
+    fingers.stationary(0).press(1, QPoint(140, 50), m->mList).commit();
+    fingers.stationary(0).move(1, QPoint(140, 300), m->mList).commit();
+    fingers.stationary(0).release(1, QPoint(140, 300), m->mList).commit();
+    fingers.release(0, QPoint(100, 50), m->mList).commit();
+    QCOMPARE(m->takeLog(), (Names{"pressed 0", "released 0", "clicked 0"}));
+    QCOMPARE(m->value(), 0);
+}
+
+void TestScrollViewer::firstFingerLiftedFirst()
+{
+    m->fill(20);
+    auto fingers = m->fingers();
+    fingers.press(0, QPoint(100, 50), m->mList).commit();
+    fingers.stationary(0).press(1, QPoint(140, 50), m->mList).commit();
+    fingers.release(0, QPoint(100, 50), m->mList).stationary(1).commit();
+    QCOMPARE(m->takeLog(), (Names{"pressed 0", "released 0", "clicked 0"}));
+    fingers.move(1, QPoint(140, 90), m->mList).commit();
+    fingers.release(1, QPoint(140, 90), m->mList).commit();
+    QCOMPARE(m->takeLog(), Names());
+    QCOMPARE(m->clock.running(), 0);
+}
+
+void TestScrollViewer::cancelledTap()
+{
+    m->fill(20);
+    m->press(100, 150);
+    m->takeLog();
+    QTouchEvent cancel(QEvent::TouchCancel, m_device);
+    QCoreApplication::sendEvent(m->mList->getWidgetItem(1), &cancel);
+    m->clock.advance(2000);
+    QCOMPARE(m->takeLog(), Names());
+    m->release(100, 150);
+    QCOMPARE(m->takeLog(), Names());
+    m->tap(100, 150);
+    QCOMPARE(m->takeLog().size(), 3);
+}
+
+void TestScrollViewer::cancelledDrag()
+{
+    lift(1);
+    KSBaseItemWidget* row = m->mList->getSelectedItem();
+    m->move(50, 160);
+    m->move(50, 264);
+    QTouchEvent cancel(QEvent::TouchCancel, m_device);
+    QCoreApplication::sendEvent(row, &cancel);
+    QVERIFY(!m->mList->isDragging());
+    QCOMPARE(m->order().mid(0, 4), (Names{"0", "2", "1", "3"}));
+    QCOMPARE(m->takeLog(), Names{"dropped"});
+    m->release(50, 264);
+    QCOMPARE(m->takeLog(), Names());
+    QVERIFY(!QWidget::mouseGrabber());
+}
+
+void TestScrollViewer::hidingEndsThePress()
+{
+    m->fill(20);
+    m->press(100, 150);
+    m->takeLog();
+    m->mList->hide();
+    m->clock.advance(2000);
+    m->release(100, 150);
+    QCOMPARE(m->takeLog(), Names());
+    QCOMPARE(m->clock.running(), 0);
+    m->mList->show();
+}
+
+void TestScrollViewer::clearedUnderTheFinger()
+{
+    m->fill(20);
+    m->press(100, 150);
+    m->takeLog();
+    for (int i = m->mList->count() - 1; i >= 0; --i)
+        delete m->mList->getWidgetItem(i);
+    m->clock.advance(2000);
+    m->move(100, 300);
+    m->release(100, 300);
+    QVERIFY(!m->takeLog().join(QLatin1Char(' ')).contains(QLatin1Char('1')));
+    // The row was the target, so its lock waits for the watchdog.
+    m->mFilter.resetLock();
+}
+
+void TestScrollViewer::remoteLockMidTouch()
+{
+    m->fill(20);
+    m->press(100, 150);
+    QCOMPARE(m->takeLog(), Names{"pressed 1"});
+    m->mFilter.resetLock(); // as another process's lock does
+    m->move(100, 400);
+    m->release(100, 400);
+    QCOMPARE(m->takeLog(), Names());
+    m->clock.advance(2000);
+    m->takeLog();
+    m->tap(100, 150);
+    QCOMPARE(m->takeLog(), (Names{"pressed 1", "released 1", "clicked 1"}));
+}
+
+void TestScrollViewer::timersCanStartAnew()
+{
+    m->fill(20);
+    m->press(100, 150);
+    m->takeLog();
+    m->clock.advance(600);
+    m->mList->allTimersReset();
+    m->clock.advance(600);
+    QCOMPARE(m->takeLog(), Names());
+    m->clock.advance(100);
+    QCOMPARE(m->takeLog(), Names{"held 1"});
+    m->release(100, 150);
+    m->press(100, 150);
+    m->takeLog();
+    m->mList->stopTapAndHoldTimer();
+    m->clock.advance(900);
+    QCOMPARE(m->takeLog(), Names());
+    m->release(100, 150);
+}
+
+void TestScrollViewer::stretchTimerAligns()
+{
+    m->fill(20);
+    m->mList->slotSetScrollBarValue(130);
+    QSignalSpy stopped(m->mList, &KSScrollViewerWidget::minitrimStop);
+    m->mList->slotHandleStretchTimer();
+    QCOMPARE(m->value(), ScrollViewerFixture::ROW);
+    QCOMPARE(stopped.count(), 1);
+    m->mList->slotSetScrollBarValue(m->maximum());
+    m->mList->slotHandleStretchTimer();
+    QCOMPARE(m->value(), m->maximum());
+    QCOMPARE(stopped.count(), 2);
+}
+
+void TestScrollViewer::barUnderTheFinger()
+{
+    m->fill(20);
+    KSScrollBar* bar = m->mList->getVScrollBar();
+    QVERIFY(bar->isVisible());
+    const QRect handle = bar->handleRect();
+    QTest::touchEvent(bar, m_device).press(0, handle.center());
+    QVERIFY(bar->isPressed());
+    QCOMPARE(m->value(), 0);
+    QTest::touchEvent(bar, m_device).move(0, handle.center() + QPoint(0, 100));
+    QVERIFY(m->value() > 100);
+    QTest::touchEvent(bar, m_device).release(0, handle.center() + QPoint(0, 100));
+    QVERIFY(!bar->isPressed());
+    QCOMPARE(m->takeLog(), Names());
+    // Beside the handle the list jumps there.
+    QTest::touchEvent(bar, m_device).press(0, QPoint(16, 450));
+    QVERIFY(m->value() > 1000);
+    QVERIFY(bar->handleRect().contains(16, 450));
+    QTest::touchEvent(bar, m_device).release(0, QPoint(16, 450));
+    QCOMPARE(bar->value(), m->value());
+}
+
+void TestScrollViewer::pressOnTheBarBrakes()
+{
+    m->fill(60);
+    m->press(100, 400);
+    m->drag(100, 400, 340, 3);
+    m->move(100, 100);
+    m->release(100, 100);
+    QVERIFY(m->mList->isAutoFilck());
+    KSScrollBar* bar = m->mList->getVScrollBar();
+    QTest::touchEvent(bar, m_device).press(0, bar->handleRect().center());
+    QVERIFY(!m->mList->isAutoFilck());
+    QTest::touchEvent(bar, m_device).release(0, bar->handleRect().center());
+    QCOMPARE(m->clock.running(), 0);
+}
+
+QTEST_MAIN(TestScrollViewer)
+#include "tst_scrollviewer.moc"

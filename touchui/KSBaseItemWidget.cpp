@@ -1,0 +1,311 @@
+#include "touchui/KSBaseItemWidget.h"
+
+#include <QCoreApplication>
+#include <QEvent>
+#include <QEventPoint>
+#include <QGraphicsDropShadowEffect>
+#include <QHBoxLayout>
+#include <QLabel>
+#include <QPainter>
+#include <QPixmap>
+#include <QPointerEvent>
+#include <QStyle>
+#include <QStyleOption>
+#include <QVBoxLayout>
+
+namespace
+{
+
+constexpr int HANDLE_SIZE = 22;
+constexpr int HANDLE_LEFT = 6;
+const QString HANDLE_PICTURE = QStringLiteral(":/MainButtons/Main_Move_Handle");
+
+// Where the press is, in global coordinates.
+QPoint pressPosition(const QEvent* event)
+{
+    const auto& points = static_cast<const QPointerEvent*>(event)->points();
+    return points.isEmpty() ? QPoint() : points.constFirst().globalPosition().toPoint();
+}
+
+} // namespace
+
+KSBaseItemWidget::KSBaseItemWidget(QWidget* parent)
+    : KSPushbutton(parent), m_handle(new QLabel(this)), m_shadow(new QGraphicsDropShadowEffect(this))
+{
+    KSBaseItemWidget::setNormalStyle();
+    setFocusPolicy(Qt::NoFocus);
+    m_shadow->setBlurRadius(15.0);
+    m_shadow->setColor(QColor(0, 0, 0, 255));
+    m_shadow->setOffset(0, 0);
+    m_shadow->setEnabled(false);
+    setGraphicsEffect(m_shadow);
+    m_handle->setPixmap(QPixmap(HANDLE_PICTURE));
+    m_handle->setStyleSheet(QStringLiteral("background-color: rgb(51, 51, 51)"));
+    m_handle->setAttribute(Qt::WA_TransparentForMouseEvents);
+    m_handle->hide();
+}
+
+KSBaseItemWidget::~KSBaseItemWidget() = default;
+
+void KSBaseItemWidget::takeChild(QPointer<QWidget>& place, QWidget* child)
+{
+    if (place && place != child)
+        delete place.data();
+    place = child;
+}
+
+void KSBaseItemWidget::setChild(QWidget* child, ChildPosEnum position)
+{
+    if (child) {
+        child->setAttribute(Qt::WA_TransparentForMouseEvents);
+        child->setParent(this);
+        if (parent())
+            child->installEventFilter(parent());
+    }
+    switch (position) {
+    case CHILD_LEFT:
+        takeChild(m_left, child);
+        m_whole = false;
+        break;
+    case CHILD_RIGHT:
+        takeChild(m_right, child);
+        m_whole = false;
+        break;
+    case CHILD_THIRD:
+        takeChild(m_third, child);
+        break;
+    default:
+        takeChild(m_right, nullptr);
+        takeChild(m_third, nullptr);
+        takeChild(m_left, child);
+        m_whole = true;
+        break;
+    }
+}
+
+void KSBaseItemWidget::createWidget()
+{
+    if (!m_column) {
+        m_column = new QVBoxLayout(this);
+        m_row = new QHBoxLayout;
+        m_column->addLayout(m_row);
+    }
+    m_column->setContentsMargins(m_spaceAround, m_spaceAround, m_spaceAround, m_spaceAround);
+    m_column->setSpacing(m_spaceBetween);
+    m_row->setSpacing(m_spaceBetween);
+    for (QWidget* child : {m_left.data(), m_right.data(), m_third.data()}) {
+        if (!child)
+            continue;
+        if (child == m_third)
+            m_column->addWidget(child);
+        else
+            m_row->addWidget(child);
+        child->show();
+    }
+}
+
+QWidget* KSBaseItemWidget::getChild(ChildPosEnum position) const
+{
+    switch (position) {
+    case CHILD_RIGHT:
+        return getRightChild();
+    case CHILD_THIRD:
+        return getThirdChild();
+    default:
+        return getLeftChild();
+    }
+}
+
+QWidget* KSBaseItemWidget::getLeftChild() const
+{
+    return m_left;
+}
+
+QWidget* KSBaseItemWidget::getRightChild() const
+{
+    return m_whole ? m_left : m_right;
+}
+
+QWidget* KSBaseItemWidget::getThirdChild() const
+{
+    return m_whole ? m_left : m_third;
+}
+
+KSBaseItemWidget* KSBaseItemWidget::clone()
+{
+    return nullptr;
+}
+
+void KSBaseItemWidget::setSelectedStyle()
+{
+    setStyleSheet(QStringLiteral("QPushButton { background: rgb(0, 129, 255) }"));
+}
+
+void KSBaseItemWidget::setNormalStyle()
+{
+    setStyleSheet(QStringLiteral("QPushButton { background-color: rgb(51, 51, 51) }"));
+}
+
+void KSBaseItemWidget::setPopup(bool popup)
+{
+    m_shadow->setEnabled(popup);
+    m_popup = popup;
+    updateDragArea();
+    update();
+}
+
+void KSBaseItemWidget::setSpace(int between, int around)
+{
+    m_spaceBetween = qMax(between, 0);
+    m_spaceAround = qMax(around, 0);
+    if (m_column)
+        createWidget();
+}
+
+void KSBaseItemWidget::setDragFlag(bool dragFlag)
+{
+    m_dragFlag = dragFlag;
+    updateDragArea();
+    if (dragFlag) {
+        m_handle->setGeometry(QRect(getHandlePos(), QSize(HANDLE_SIZE, HANDLE_SIZE)));
+        m_handle->show();
+        m_handle->raise();
+    } else {
+        m_handle->hide();
+    }
+}
+
+void KSBaseItemWidget::setDragFlagAlignment(DragFlagAlignment alignment)
+{
+    m_alignment = alignment;
+    updateDragArea();
+    m_handle->move(getHandlePos());
+    update();
+}
+
+DragFlagAlignment KSBaseItemWidget::getDragFlagAlignment() const
+{
+    return m_alignment;
+}
+
+QRect KSBaseItemWidget::getDragArea() const
+{
+    return m_dragArea;
+}
+
+int KSBaseItemWidget::handleTop() const
+{
+    return (rect().bottom() - HANDLE_SIZE) / 2;
+}
+
+QPoint KSBaseItemWidget::getHandlePos() const
+{
+    switch (m_alignment) {
+    case DRAGFLAG_LEFT:
+        return QPoint(HANDLE_LEFT, handleTop());
+    case DRAGFLAG_RIGHT:
+        return QPoint(width() - HANDLE_SIZE, handleTop());
+    default:
+        return QPoint(0, handleTop());
+    }
+}
+
+void KSBaseItemWidget::updateDragArea()
+{
+    const int top = handleTop();
+    switch (m_alignment) {
+    case DRAGFLAG_LEFT:
+        m_dragArea = QRect(QPoint(0, top - 10), QPoint(35, top + 31));
+        break;
+    case DRAGFLAG_RIGHT:
+        m_dragArea = QRect(QPoint(width() - 36, top - 10), QPoint(width() - 1, top + 31));
+        break;
+    default:
+        m_dragArea = QRect();
+        break;
+    }
+}
+
+// The application is only watched while there is a focus to lose.
+void KSBaseItemWidget::setHasFocus(bool hasFocus)
+{
+    if (m_hasFocus == hasFocus)
+        return;
+    m_hasFocus = hasFocus;
+    if (hasFocus)
+        QCoreApplication::instance()->installEventFilter(this);
+    else
+        QCoreApplication::instance()->removeEventFilter(this);
+}
+
+bool KSBaseItemWidget::eventFilter(QObject* watched, QEvent* event)
+{
+    const bool press = event->type() == QEvent::MouseButtonPress || event->type() == QEvent::TouchBegin;
+    // A press inside comes by again as it goes up through the parents, so its place tells, not its receiver.
+    if (press && m_hasFocus && !m_popup && watched->isWidgetType() &&
+        !rect().contains(mapFromGlobal(pressPosition(event)))) {
+        setHasFocus(false);
+        Q_EMIT signalLostFocus();
+    }
+    return KSPushbutton::eventFilter(watched, event);
+}
+
+bool KSBaseItemWidget::event(QEvent* event)
+{
+    switch (event->type()) {
+    case QEvent::MouseButtonPress:
+        setHasFocus(true);
+        return false;
+    case QEvent::MouseMove:
+    case QEvent::MouseButtonRelease:
+        return false;
+    case QEvent::MouseButtonDblClick:
+        return true;
+    case QEvent::TouchBegin:
+        setHasFocus(true);
+        return KSPushbutton::event(event);
+    default:
+        return KSPushbutton::event(event);
+    }
+}
+
+void KSBaseItemWidget::resizeEvent(QResizeEvent* event)
+{
+    KSPushbutton::resizeEvent(event);
+    updateDragArea();
+    m_handle->move(getHandlePos());
+    if (size() == m_lastSize)
+        return;
+    m_lastSize = size();
+    Q_EMIT signalResize();
+}
+
+void KSBaseItemWidget::paintEvent(QPaintEvent*)
+{
+    QPainter painter(this);
+    if (m_popup) {
+        paintDragBase(painter);
+    } else {
+        // The rule of the style sheet alone: as a button it would get the style's bevel, too.
+        QStyleOption option;
+        option.initFrom(this);
+        style()->drawPrimitive(QStyle::PE_Widget, &option, &painter, this);
+    }
+    paintDragFlag(painter);
+}
+
+void KSBaseItemWidget::paintDragBase(QPainter& painter)
+{
+    const QPixmap left(QStringLiteral(":/MainButtons/Main_drag_base_Left"));
+    const QPixmap center(QStringLiteral(":/MainButtons/Main_drag_base_Center"));
+    const QPixmap right(QStringLiteral(":/MainButtons/Main_drag_base_Right"));
+    painter.drawPixmap(QRect(0, 0, left.width(), height()), left);
+    painter.drawPixmap(QRect(left.width(), 0, width() - left.width() - right.width(), height()), center);
+    painter.drawPixmap(QRect(width() - right.width(), 0, right.width(), height()), right);
+}
+
+void KSBaseItemWidget::paintDragFlag(QPainter& painter)
+{
+    if (m_dragFlag && m_alignment != DRAGFLAG_NONE)
+        painter.drawPixmap(getHandlePos(), QPixmap(HANDLE_PICTURE));
+}

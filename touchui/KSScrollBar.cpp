@@ -1,0 +1,183 @@
+#include "touchui/KSScrollBar.h"
+
+#include <QEventPoint>
+#include <QKeyEvent>
+#include <QMouseEvent>
+#include <QPainter>
+#include <QStyle>
+#include <QStyleOptionSlider>
+#include <QTouchEvent>
+
+KSScrollBar::KSScrollBar(QWidget* parent) : QScrollBar(parent)
+{
+    init();
+}
+
+KSScrollBar::KSScrollBar(Qt::Orientation orientation, QWidget* parent) : QScrollBar(orientation, parent)
+{
+    init();
+}
+
+void KSScrollBar::init()
+{
+    setAttribute(Qt::WA_AcceptTouchEvents);
+    setFocusPolicy(Qt::NoFocus);
+}
+
+bool KSScrollBar::event(QEvent* event)
+{
+    switch (event->type()) {
+    case QEvent::TouchBegin:
+    case QEvent::TouchUpdate:
+    case QEvent::TouchEnd:
+    case QEvent::TouchCancel:
+        return handleTouch(event);
+    case QEvent::ContextMenu:
+        return true;
+    default:
+        return QScrollBar::event(event);
+    }
+}
+
+bool KSScrollBar::handleTouch(QEvent* event)
+{
+    const auto* touch = static_cast<QTouchEvent*>(event);
+    if (touch->points().isEmpty() || event->type() == QEvent::TouchCancel) {
+        if (m_pressed) {
+            QMouseEvent release(QEvent::MouseButtonRelease, QPointF(), mapToGlobal(QPointF()), Qt::LeftButton,
+                                Qt::NoButton, Qt::NoModifier);
+            mouseReleaseEvent(&release);
+        }
+        return true;
+    }
+    const QEventPoint& point = touch->points().constFirst();
+    const QPointF exact = point.position();
+    const QPoint cut(static_cast<int>(exact.x()), static_cast<int>(exact.y()));
+    const auto send = [&](QEvent::Type type, const QPoint& position) {
+        const bool held = type != QEvent::MouseButtonRelease;
+        QMouseEvent mouse(type, position, mapToGlobal(position),
+                          type == QEvent::MouseMove ? Qt::NoButton : Qt::LeftButton,
+                          held ? Qt::LeftButton : Qt::NoButton, Qt::NoModifier);
+        if (type == QEvent::MouseButtonPress)
+            mousePressEvent(&mouse);
+        else if (type == QEvent::MouseMove)
+            mouseMoveEvent(&mouse);
+        else
+            mouseReleaseEvent(&mouse);
+    };
+    if (event->type() == QEvent::TouchBegin)
+        send(QEvent::MouseButtonPress, cut);
+    else if (event->type() == QEvent::TouchUpdate)
+        send(QEvent::MouseMove, cut);
+    else
+        send(QEvent::MouseButtonRelease, exact.toPoint());
+    return true;
+}
+
+void KSScrollBar::mousePressEvent(QMouseEvent* event)
+{
+    m_pressed = true;
+    QScrollBar::mousePressEvent(event);
+    update();
+}
+
+void KSScrollBar::mouseReleaseEvent(QMouseEvent* event)
+{
+    m_pressed = false;
+    QScrollBar::mouseReleaseEvent(event);
+    update();
+}
+
+void KSScrollBar::keyReleaseEvent(QKeyEvent* event)
+{
+    if (event->key() == Qt::Key_PageUp || event->key() == Qt::Key_PageDown) {
+        event->ignore();
+        return;
+    }
+    QScrollBar::keyReleaseEvent(event);
+}
+
+const QPixmap& KSScrollBar::base()
+{
+    if (m_base.isNull()) {
+        m_base.load(orientation() == Qt::Vertical ? QStringLiteral(":/Scrollbar/Scbar_base_v")
+                                                  : QStringLiteral(":/Scrollbar/Scbar_base_h"));
+    }
+    return m_base;
+}
+
+const KSScrollBar::Handle& KSScrollBar::handlePictures()
+{
+    Handle& handle = m_handles[m_pressed ? 1 : 0];
+    bool& loaded = m_loaded[m_pressed ? 1 : 0];
+    if (loaded)
+        return handle;
+    loaded = true;
+    const bool vertical = orientation() == Qt::Vertical;
+    QString name = vertical ? (m_pressed ? QStringLiteral(":/Scrollbar/Scbar_handle_v_pressed_")
+                                         : QStringLiteral(":/Scrollbar/Scbar_handle_v_rest_"))
+                            : (m_pressed ? QStringLiteral(":/Scrollbar/Scbar_handle_h_pressed_")
+                                         : QStringLiteral(":/Scrollbar/Scbar_handle_h_rest_"));
+    handle.first.load(name + (vertical ? QStringLiteral("upper") : QStringLiteral("left")));
+    handle.center.load(name + QStringLiteral("center"));
+    handle.last.load(name + (vertical ? QStringLiteral("bottom") : QStringLiteral("right")));
+    handle.grip.load(name + QStringLiteral("center_interval"));
+    return handle;
+}
+
+QRect KSScrollBar::handleRect() const
+{
+    QStyleOptionSlider option;
+    initStyleOption(&option);
+    return style()->subControlRect(QStyle::CC_ScrollBar, &option, QStyle::SC_ScrollBarSlider, this);
+}
+
+void KSScrollBar::paintEvent(QPaintEvent*)
+{
+    QRect handle = handleRect();
+    QPainter painter(this);
+    if (orientation() == Qt::Vertical)
+        paintVertical(&painter, handle);
+    else
+        paintHorizontal(&painter, handle);
+}
+
+void KSScrollBar::paintVertical(QPainter* painter, QRect& handle)
+{
+    painter->fillRect(rect(), QColor(51, 51, 51));
+    if (!base().isNull())
+        painter->drawPixmap(rect(), base());
+    const Handle& pictures = handlePictures();
+    const int x = handle.x() + (handle.width() - pictures.center.width()) / 2;
+    const int first = pictures.first.height();
+    const int last = pictures.last.height();
+    painter->drawPixmap(x, handle.y(), pictures.first);
+    const QRect center(x, handle.y() + first, pictures.center.width(), handle.height() - first - last);
+    if (center.height() > 0)
+        painter->drawPixmap(center, pictures.center);
+    painter->drawPixmap(x, handle.bottom() + 1 - last, pictures.last);
+    if (center.height() >= pictures.grip.height()) {
+        painter->drawPixmap(handle.x() + (handle.width() - pictures.grip.width()) / 2,
+                            center.y() + (center.height() - pictures.grip.height()) / 2, pictures.grip);
+    }
+}
+
+void KSScrollBar::paintHorizontal(QPainter* painter, QRect& handle)
+{
+    painter->fillRect(rect(), QColor(51, 51, 51));
+    if (!base().isNull())
+        painter->drawPixmap(rect(), base());
+    const Handle& pictures = handlePictures();
+    const int y = handle.y() + (handle.height() - pictures.center.height()) / 2;
+    const int first = pictures.first.width();
+    const int last = pictures.last.width();
+    painter->drawPixmap(handle.x(), y, pictures.first);
+    const QRect center(handle.x() + first, y, handle.width() - first - last, pictures.center.height());
+    if (center.width() > 0)
+        painter->drawPixmap(center, pictures.center);
+    painter->drawPixmap(handle.right() + 1 - last, y, pictures.last);
+    if (center.width() >= pictures.grip.width()) {
+        painter->drawPixmap(center.x() + (center.width() - pictures.grip.width()) / 2,
+                            handle.y() + (handle.height() - pictures.grip.height()) / 2, pictures.grip);
+    }
+}

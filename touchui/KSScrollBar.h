@@ -1,0 +1,48 @@
+#pragma once
+
+#include <QPixmap>
+#include <QScrollBar>
+
+class QPainter;
+
+// A scroll bar that paints itself from pictures and that a finger works like a mouse. GUI thread only.
+class KSScrollBar : public QScrollBar
+{
+    Q_OBJECT
+public:
+    explicit KSScrollBar(QWidget* parent = nullptr);
+    explicit KSScrollBar(Qt::Orientation orientation, QWidget* parent = nullptr);
+
+    bool isPressed() const { return m_pressed; }
+    // In widget coordinates.
+    QRect handleRect() const;
+
+    // The rectangle is the handle's, in widget coordinates.
+    virtual void paintHorizontal(QPainter* painter, QRect& handle);
+    virtual void paintVertical(QPainter* painter, QRect& handle);
+
+protected:
+    bool event(QEvent* event) override;
+    void paintEvent(QPaintEvent* event) override;
+    void mousePressEvent(QMouseEvent* event) override;
+    void mouseReleaseEvent(QMouseEvent* event) override;
+    void keyReleaseEvent(QKeyEvent* event) override;
+
+private:
+    // Ends, centre and the grip over its middle.
+    struct Handle {
+        QPixmap first;
+        QPixmap center;
+        QPixmap last;
+        QPixmap grip;
+    };
+    void init();
+    const Handle& handlePictures();
+    const QPixmap& base();
+    bool handleTouch(QEvent* event);
+
+    bool m_pressed = false;
+    Handle m_handles[2]; // at rest and pressed; loaded at first use
+    QPixmap m_base;
+    bool m_loaded[2] = {false, false};
+};

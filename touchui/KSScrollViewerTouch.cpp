@@ -1,0 +1,657 @@
+// What fingers and mouse do to the list: flicks, presses and the dragging of items.
+#include "touchui/KSScrollViewerWidget.h"
+
+#include "support/LogManager.h"
+#include "touchui/KSScrollBar.h"
+#include "touchui/ScrollViewerBoard.h"
+#include "touchui/ScrollViewerDrag.h"
+
+#include <QEventPoint>
+#include <QHideEvent>
+#include <QMouseEvent>
+#include <QPaintEvent>
+#include <QPainter>
+#include <QTimerEvent>
+#include <QTouchEvent>
+
+namespace
+{
+
+bool isTouch(const QEvent* event)
+{
+    return event->type() == QEvent::TouchBegin || event->type() == QEvent::TouchUpdate ||
+           event->type() == QEvent::TouchEnd || event->type() == QEvent::TouchCancel;
+}
+
+const QEventPoint* pointOf(const QTouchEvent* event, int id)
+{
+    for (const QEventPoint& point : event->points()) {
+        if (point.id() == id)
+            return &point;
+    }
+    return nullptr;
+}
+
+} // namespace
+
+bool KSScrollViewerWidget::eventFilter(QObject* object, QEvent* event)
+{
+    if (object == m_bar)
+        return handleVScrollBarEvent(event);
+    if (object == m_board->board() && event->type() == QEvent::Paint) {
+        QPainter painter(m_board->board());
+        if (m_hasSeparator)
+            m_board->paintSeparators(painter, static_cast<QPaintEvent*>(event)->rect());
+        return true;
+    }
+    if (event->type() == QEvent::Gesture || isTouch(event))
+        return handleTouchEventFilter(object, event);
+    return QScrollArea::eventFilter(object, event);
+}
+
+bool KSScrollViewerWidget::handleVScrollBarEvent(QEvent* event)
+{
+    switch (event->type()) {
+    case QEvent::Wheel:
+        wheelEvent(static_cast<QWheelEvent*>(event));
+        return true;
+    case QEvent::ContextMenu:
+        return true;
+    case QEvent::MouseButtonPress:
+    case QEvent::TouchBegin:
+        stopFlick();
+        refreshVisible();
+        handleScrollBarPressedEvent(event);
+        return false;
+    default:
+        return false;
+    }
+}
+
+// Beside the handle the list jumps, so that the handle comes under the press and can be dragged on from
+// there.
+void KSScrollViewerWidget::handleScrollBarPressedEvent(QEvent* event)
+{
+    slotScrollBarSliderPressed();
+    const QList<QEventPoint>& points = static_cast<QPointerEvent*>(event)->points();
+    if (points.isEmpty())
+        return;
+    const int y = m_bar->mapFromGlobal(points.constFirst().globalPosition().toPoint()).y();
+    const QRect handle = m_bar->handleRect();
+    if (y >= handle.top() && y <= handle.bottom())
+        m_bar->update();
+    else
+        slotSetScrollBarValue(y * m_board->board()->height() / qMax(height(), 1) - height() / 2);
+}
+
+bool KSScrollViewerWidget::handleTouchEventFilter(QObject* object, QEvent* event)
+{
+    if (event->type() == QEvent::Gesture)
+        return object == this || object == viewport();
+    auto* touch = static_cast<QTouchEvent*>(event);
+    if (event->type() == QEvent::TouchCancel) {
+        cancelTouch();
+        return true;
+    }
+    if (touch->points().isEmpty() || isOtherItemTouchWhenGraping(object, event))
+        return true;
+    auto* item = qobject_cast<KSBaseItemWidget*>(object);
+    const bool isItem = item && (m_board->indexOf(item) >= 0 || m_drag->item() == item);
+    if (!isItem && object != this && object != viewport()) {
+        onTranslateTouchEventToMouse(object, touch);
+        return true;
+    }
+    if (isAutoFilck()) {
+        const bool result = onTouchEvent(object, touch);
+        const QPointF position = touch->points().constFirst().globalPosition();
+        handleFlickBeginEvent(object, mapFromGlobal(position.toPoint()));
+        return result;
+    }
+    const bool result = onTouchEvent(object, touch);
+    onTranslateTouchEventToMouse(object, touch);
+    return result;
+}
+
+// A finger on a list in flight stops it and presses nothing.
+void KSScrollViewerWidget::handleFlickBeginEvent(QObject* object, const QPoint& pos)
+{
+    m_press.drop();
+    m_press.object = object;
+    m_press.press = pos;
+    m_press.last = pos;
+    m_scrollValue = verticalScrollBar()->value();
+    m_press.stopTimers();
+    m_press.clearItem();
+}
+
+bool KSScrollViewerWidget::isOtherItemTouchWhenGraping(QObject* object, QEvent* event) const
+{
+    if (!m_drag->isActive() || !isTouch(event))
+        return false;
+    if (object == this || object == viewport())
+        return true;
+    return m_board->indexOf(qobject_cast<KSBaseItemWidget*>(object)) >= 0;
+}
+
+// The window system took the touch away: nothing is tapped, and what is lifted drops where it is.
+void KSScrollViewerWidget::cancelTouch()
+{
+    m_flick.letGo();
+    m_flick.rest();
+    stopFlick();
+    m_press.stopTimers();
+    m_press.object.clear();
+    m_press.drop();
+    m_press.willFlick = false;
+    m_press.popupRequested = false;
+    handleDropItemWhenRelease();
+}
+
+void KSScrollViewerWidget::hideEvent(QHideEvent* event)
+{
+    cancelTouch();
+    QScrollArea::hideEvent(event);
+}
+
+bool KSScrollViewerWidget::onTouchEvent(QObject* object, QTouchEvent* event)
+{
+    const QEventPoint& first = event->points().constFirst();
+    const QPointF position = mapFromGlobal(first.globalPosition());
+    if (event->type() == QEvent::TouchBegin) {
+        if (m_isTake)
+            return false;
+        stopFlick();
+        setFlickAbility(true);
+        m_flick.begin(first.id(), position);
+        setStartPoint(position);
+        setEndPoint(position);
+        return true;
+    }
+    if (first.id() != m_flick.touchId())
+        return !m_isTake;
+    // The finger may be lifted while another stays, which is no end of the sequence.
+    if (event->type() == QEvent::TouchUpdate && first.state() != QEventPoint::State::Released) {
+        m_flick.follow(position);
+        setEndPoint(position);
+        m_press.object = object;
+        return true;
+    }
+    m_flick.letGo();
+    setEndPoint(position);
+    if (flickAbility() && !isFlickEnd()) {
+        m_savedMinitrim = std::exchange(m_minitrim, false);
+        if (!m_flick.isBounded()) {
+            setAutoFlick(true);
+            return true;
+        }
+    }
+    stopFlick();
+    return true;
+}
+
+void KSScrollViewerWidget::setStartPoint(const QPointF& point)
+{
+    m_flick.setStart(point);
+}
+
+void KSScrollViewerWidget::setEndPoint(const QPointF& point)
+{
+    if (!flickAbility())
+        return;
+    m_flick.setEnd(point);
+    if (isFlickEnd() || m_flick.isRunning())
+        return;
+    m_scrollValue = verticalScrollBar()->value();
+    m_flick.startTimer();
+}
+
+bool KSScrollViewerWidget::isFlickEnd() const
+{
+    return m_flick.isEnd();
+}
+
+bool KSScrollViewerWidget::isMove() const
+{
+    return m_flick.isMove();
+}
+
+bool KSScrollViewerWidget::hasFlicked() const
+{
+    return m_flick.hasFlicked();
+}
+
+void KSScrollViewerWidget::stopFlick()
+{
+    m_flick.stopTimer();
+    setAutoFlick(false);
+}
+
+void KSScrollViewerWidget::setAutoFlick(bool autoFlick)
+{
+    m_flick.setAuto(autoFlick);
+}
+
+bool KSScrollViewerWidget::isAutoFilck() const
+{
+    return m_flick.isAuto();
+}
+
+bool KSScrollViewerWidget::flickAbility() const
+{
+    return m_flick.isAble();
+}
+
+void KSScrollViewerWidget::setFlickAbility(bool ability)
+{
+    m_flick.setAble(ability);
+    if (!ability)
+        stopFlick();
+}
+
+void KSScrollViewerWidget::timerEvent(QTimerEvent* event)
+{
+    if (!m_flick.isTimer(event->timerId())) {
+        QScrollArea::timerEvent(event);
+        return;
+    }
+    if (!isFlickEnd()) {
+        changeScrollBarValue(static_cast<int>(getDistance().y()));
+    } else {
+        if (!isAutoFilck())
+            m_minitrim = m_savedMinitrim;
+        stopFlick();
+    }
+    if (FlickMotion::isAtLimit(verticalScrollBar()->value(), m_bar->minimum(), m_bar->maximum()))
+        stopFlick();
+}
+
+QPointF KSScrollViewerWidget::getDistance()
+{
+    return m_flick.advance(dragBounds());
+}
+
+std::optional<FlickMotion::DragBounds> KSScrollViewerWidget::dragBounds() const
+{
+    const KSBaseItemWidget* item = m_press.item;
+    if (!item || m_board->indexOf(item) < 0)
+        return std::nullopt;
+    const int top = m_board->board()->mapTo(this, item->pos()).y();
+    return FlickMotion::DragBounds{top, top + item->height() - 1, height()};
+}
+
+void KSScrollViewerWidget::onTranslateTouchEventToMouse(QObject* object, QTouchEvent* event)
+{
+    QPoint pos = mapFromGlobal(event->points().constFirst().globalPosition().toPoint());
+    switch (event->type()) {
+    case QEvent::TouchBegin:
+        onTranslateTouchBeginEventToMouse(object, event, pos);
+        break;
+    case QEvent::TouchUpdate:
+        onTranslateTouchUpdateEventToMouse(object, event, pos);
+        break;
+    case QEvent::TouchEnd:
+        onTranslateTouchEndEventToMouse(object, event, pos);
+        break;
+    default:
+        break;
+    }
+}
+
+void KSScrollViewerWidget::onTranslateTouchBeginEventToMouse(QObject* object, QTouchEvent* event, QPoint& pos)
+{
+    m_press.object = object;
+    beginPress(event->points().constFirst().id(), pos, Qt::LeftButton);
+}
+
+void KSScrollViewerWidget::beginPress(int touchId, const QPoint& pos, Qt::MouseButton button)
+{
+    m_scrollValue = verticalScrollBar()->value();
+    m_press.begin(touchId, pos, m_scrollValue);
+    m_press.item = m_board->itemAroundThePos(toBoard(pos), calculateVisibleRect());
+    m_press.index = m_board->indexOf(m_press.item);
+    if (pos.x() < m_effectiveLeft || pos.x() > m_effectiveLeft + m_effectiveWidth) {
+        m_press.clearItem();
+        m_press.drop();
+        return;
+    }
+    QMouseEvent press(QEvent::MouseButtonPress, pos, mapToGlobal(pos), button, button, Qt::NoModifier);
+    if (m_press.index < 0) {
+        handleAreaPressedEvent(&press);
+        return;
+    }
+    m_press.positionInItem = m_press.item->mapFrom(this, pos);
+    m_press.calculateBounds(m_press.item->height(), height());
+    m_press.item->setHasFocus(true);
+    if (m_itemsCanDrag && isItemDragAreaPressed()) {
+        m_drag->setSize(m_press.item->size());
+        m_press.popup.start(ScrollViewerPress::POPUP_TIME);
+        m_press.dragAreaPressed = true;
+    } else {
+        handleItemPressedEvent(&press);
+    }
+}
+
+bool KSScrollViewerWidget::isItemDragAreaPressed() const
+{
+    const QRect area = m_press.item->getDragArea();
+    return !area.isNull() && area.contains(m_press.positionInItem);
+}
+
+void KSScrollViewerWidget::handleItemPressedEvent(QMouseEvent* event)
+{
+    m_press.positionInItem = m_press.item->mapFrom(this, m_press.press);
+    if (event->button() == Qt::RightButton) {
+        m_press.drop();
+        Q_EMIT widgetItemRightPressed(m_press.item, m_press.positionInItem, this);
+    } else {
+        startHold(L"handleItemPressedEvent");
+    }
+}
+
+void KSScrollViewerWidget::handleAreaPressedEvent(QMouseEvent* event)
+{
+    m_press.positionInItem = QPoint(-1, -1);
+    m_press.calculateBounds(0, height());
+    if (event->button() == Qt::RightButton) {
+        m_press.drop();
+        Q_EMIT widgetItemRightPressed(nullptr, m_press.press, this);
+    } else {
+        startHold(L"handleAreaPressedEvent");
+    }
+}
+
+void KSScrollViewerWidget::startHold(const wchar_t* tag)
+{
+    m_press.hold.start(ScrollViewerPress::HOLD_TIME);
+    LOG_USER_OPERATE(tag, 200, L"Timer started");
+    Q_EMIT widgetItemPressed(m_press.item, m_press.item ? m_press.positionInItem : m_press.press, this);
+}
+
+void KSScrollViewerWidget::slotHandleMenuTimer()
+{
+    if (m_press.willFlick)
+        return;
+    Q_EMIT widgetItemLongHold(m_press.item, m_press.item ? m_press.positionInItem : m_press.press, this);
+}
+
+void KSScrollViewerWidget::stopTapAndHoldTimer()
+{
+    m_press.hold.stop();
+}
+
+void KSScrollViewerWidget::allTimersReset()
+{
+    m_stretchTimer.restartIfActive();
+    m_press.hold.restartIfActive();
+    m_drag->edgeTimer.restartIfActive();
+}
+
+void KSScrollViewerWidget::onTranslateTouchUpdateEventToMouse(QObject* object, QTouchEvent* event,
+                                                              QPoint& pos)
+{
+    if (m_press.item)
+        Q_EMIT widgetItemMouseMove(m_press.item, m_press.item->mapFromGlobal(mapToGlobal(pos)), this);
+    if (!m_press.isActive())
+        return;
+    const QEventPoint* point = pointOf(event, m_press.touchId);
+    if (!point)
+        return;
+    pos = mapFromGlobal(point->globalPosition().toPoint());
+    if (point->state() == QEventPoint::State::Released) {
+        onTranslateTouchEndEventToMouse(object, event, pos);
+        return;
+    }
+    if (m_drag->isActive()) {
+        moveDragItem(pos);
+        return;
+    }
+    if (!m_press.isBeyondSlop(pos))
+        return;
+    m_press.hold.stop();
+    if (!m_press.item)
+        return;
+    Q_EMIT signalFlick(m_press.item, m_press.positionInItem, this, m_press.willFlick);
+    if (m_press.willFlick)
+        JudgeHaveMoveNow(pos);
+}
+
+bool KSScrollViewerWidget::isInsidePressedItem(const QPoint& pos) const
+{
+    return m_press.item && m_press.item->rect().contains(m_press.item->mapFromGlobal(mapToGlobal(pos)));
+}
+
+void KSScrollViewerWidget::JudgeHaveMoveNow(const QPoint& pos)
+{
+    if (!m_press.dragAreaPressed && !isInsidePressedItem(pos)) {
+        m_press.drop();
+        m_press.willFlick = false;
+    }
+    m_press.moved = m_scrollValue != m_press.valueAtPress;
+}
+
+void KSScrollViewerWidget::onTranslateTouchEndEventToMouse(QObject*, QTouchEvent*, QPoint& pos)
+{
+    m_press.popup.stop();
+    m_press.object.clear();
+    // A list that runs on has been moved, even when its first tick is still to come.
+    if (isAutoFilck() && m_bar->maximum() > m_bar->minimum())
+        m_press.moved = true;
+    endPress(pos);
+}
+
+void KSScrollViewerWidget::endPress(const QPoint& pos)
+{
+    if (!m_press.isActive())
+        return;
+    m_press.drop();
+    m_press.stopTimers();
+    m_drag->edgeTimer.stop();
+    viewport()->releaseMouse();
+    const bool moved = m_press.moved;
+    if (moved) {
+        MouseReleaseChangeColorSingal(pos);
+    } else {
+        MouseReleaseSingal(pos);
+        m_press.willFlick = false;
+    }
+    if (m_drag->isActive() || moved) {
+        handleDropItemWhenRelease();
+        m_press.moved = false;
+        m_press.popupRequested = false;
+        m_press.willFlick = false;
+    } else if (m_press.item && isInsidePressedItem(pos)) {
+        Q_EMIT widgetItemClicked(m_press.item, m_press.positionInItem, this);
+    }
+}
+
+void KSScrollViewerWidget::MouseReleaseSingal(const QPoint& pos)
+{
+    if (!m_press.item)
+        Q_EMIT widgetItemReleased(nullptr, pos, this);
+    else if (isInsidePressedItem(pos))
+        Q_EMIT widgetItemReleased(m_press.item, m_press.item->mapFromGlobal(mapToGlobal(pos)), this);
+}
+
+void KSScrollViewerWidget::MouseReleaseChangeColorSingal(const QPoint& pos)
+{
+    if (!m_press.item)
+        Q_EMIT widgetItemChangeColor(nullptr, pos, this);
+    else if (isInsidePressedItem(pos))
+        Q_EMIT widgetItemChangeColor(m_press.item, m_press.item->mapFromGlobal(mapToGlobal(pos)), this);
+}
+
+void KSScrollViewerWidget::mousePressEvent(QMouseEvent* event)
+{
+    stopFlick();
+    m_press.object.clear();
+    beginPress(ScrollViewerPress::MOUSE_TOUCH, event->position().toPoint(), event->button());
+    event->accept();
+}
+
+void KSScrollViewerWidget::mouseMoveEvent(QMouseEvent* event)
+{
+    event->accept();
+    if (m_press.object)
+        return;
+    const QPoint pos = event->position().toPoint();
+    if (m_press.item)
+        Q_EMIT widgetItemMouseMove(m_press.item, m_press.item->mapFromGlobal(mapToGlobal(pos)), this);
+    if (!m_press.isActive())
+        return;
+    if (m_drag->isActive()) {
+        moveDragItem(pos);
+        return;
+    }
+    if (!m_press.isBeyondSlop(pos))
+        return;
+    m_press.hold.stop();
+    if (m_press.item) {
+        Q_EMIT signalFlick(m_press.item, m_press.positionInItem, this, m_press.willFlick);
+        if (m_press.willFlick)
+            JudgeHaveMoveNow(pos);
+    }
+    m_stretchTimer.stop();
+    if (pos.y() != m_press.last.y()) {
+        moveAll(pos);
+        m_press.moved = m_press.moved || m_scrollValue != m_press.valueAtPress;
+    }
+}
+
+void KSScrollViewerWidget::mouseReleaseEvent(QMouseEvent* event)
+{
+    event->accept();
+    m_press.popup.stop();
+    if (!m_press.object)
+        endPress(event->position().toPoint());
+}
+
+void KSScrollViewerWidget::moveAll(const QPoint& pos)
+{
+    if (m_press.outOfBounds && m_press.isOutside(pos.y())) {
+        m_press.last = pos;
+        return;
+    }
+    handleMovement(pos);
+    m_press.outOfBounds = m_press.isOutside(pos.y());
+    m_press.last = pos;
+}
+
+void KSScrollViewerWidget::handleMovement(const QPoint& pos)
+{
+    int distance = pos.y() - m_press.last.y();
+    if (const auto bounds = dragBounds())
+        distance = FlickMotion::boundedDistance(distance, *bounds);
+    changeScrollBarValue(distance);
+}
+
+void KSScrollViewerWidget::slotShowPopupItem()
+{
+    startDrag();
+}
+
+void KSScrollViewerWidget::slotStartDrag(KSBaseItemWidget* item)
+{
+    if (!item || m_drag->isActive() || m_board->indexOf(item) < 0)
+        return;
+    m_press.item = item;
+    m_press.index = m_board->indexOf(item);
+    m_press.popupRequested = true;
+    m_press.willFlick = false;
+    m_drag->setSize(item->size());
+    item->setPopup(true);
+    startDrag();
+}
+
+void KSScrollViewerWidget::startDrag()
+{
+    KSBaseItemWidget* item = m_press.item;
+    if (m_drag->isActive() || !item || m_board->indexOf(item) < 0)
+        return;
+    m_barPressed = true;
+    m_press.stopTimers();
+    // The finger moves the item now and not the list.
+    setFlickAbility(false);
+    m_flick.rest();
+    Q_EMIT signalDragOneItem(item, m_press.index, this);
+    QWidget* parent = s_mainWnd ? s_mainWnd.data() : window();
+    const QPoint position = parent->mapFromGlobal(mapToGlobal(m_press.press)) - m_press.positionInItem;
+    m_drag->lift(item, m_dragAlignment, parent, position);
+    viewport()->grabMouse();
+    Q_EMIT signalVisibleItemsChange();
+}
+
+void KSScrollViewerWidget::moveDragItem(const QPoint& pos)
+{
+    m_drag->moveBy(pos.y() - m_press.last.y());
+    m_press.last = pos;
+    const int top = m_drag->topIn(this);
+    if (!FlickMotion::needsEdgeScroll(top, top + m_drag->height() - height()))
+        m_drag->edgeTimer.stop();
+    else if (!m_drag->edgeTimer.isActive())
+        m_drag->edgeTimer.start(ScrollViewerDrag::SCROLL_TIME);
+    updateIndicator();
+}
+
+void KSScrollViewerWidget::slotHandleMoveTimer()
+{
+    const int top = m_drag->topIn(this);
+    changeScrollBarValue(FlickMotion::edgeScrollOffset(top, top + m_drag->height() - height()));
+    updateIndicator();
+}
+
+void KSScrollViewerWidget::updateIndicator()
+{
+    m_drag->updateIndicator(calculateVisibleRect(), isTall());
+}
+
+void KSScrollViewerWidget::dropItem()
+{
+    viewport()->releaseMouse();
+    m_press.dragAreaPressed = false;
+    KSBaseItemWidget* item = m_drag->drop();
+    if (item) {
+        m_press.item = item;
+        m_press.index = m_board->indexOf(item);
+        if (!m_itemsCanDrag)
+            item->setDragFlag(false);
+        item->show();
+    }
+    adjustLayout();
+    Q_EMIT signalItemDrop();
+    m_drag->hideLastClone();
+}
+
+void KSScrollViewerWidget::handleDropItemWhenRelease()
+{
+    if (!m_drag->isActive())
+        return;
+    const QPointer<KSBaseItemWidget> item = m_drag->item();
+    dropItem();
+    if (item && m_board->indexOf(item) >= 0 && item->geometry().bottom() > calculateVisibleRect().bottom())
+        setLastVisibleItem(item);
+}
+
+// The list changes under the finger: what was lifted is not put back.
+void KSScrollViewerWidget::abandonDrag()
+{
+    if (!m_drag->isActive())
+        return;
+    viewport()->releaseMouse();
+    m_press.clearItem();
+    m_press.drop();
+    m_press.dragAreaPressed = false;
+    m_drag->abandon();
+}
+
+void KSScrollViewerWidget::slotItemsCanDrag(bool canDrag)
+{
+    if (m_itemsCanDrag == canDrag)
+        return;
+    m_itemsCanDrag = canDrag;
+    for (KSBaseItemWidget* item : m_board->items())
+        item->setDragFlag(canDrag);
+    if (!canDrag && m_drag->isActive()) {
+        dropItem();
+        m_press.drop();
+    }
+}

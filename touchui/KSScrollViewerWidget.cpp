@@ -1,0 +1,548 @@
+// Items, layout and scroll bar of the list; what fingers do to it is in KSScrollViewerTouch.cpp.
+#include "touchui/KSScrollViewerWidget.h"
+
+#include "touchui/KSScrollBar.h"
+#include "touchui/ScrollViewerBoard.h"
+#include "touchui/ScrollViewerDrag.h"
+
+#include <QKeyEvent>
+#include <QResizeEvent>
+#include <QScopedValueRollback>
+#include <QWheelEvent>
+
+namespace
+{
+
+constexpr int DEFAULT_WIDTH = 543;
+constexpr int DEFAULT_HEIGHT = 998;
+constexpr int BAR_LEFT = 3;
+constexpr int BAR_WIDTH = 32;
+constexpr int PAGE_EXTRA = 4;
+
+const char BAR_STYLE[] =
+    "QScrollBar:vertical { margin: 0px 0px 0px 0px;  border: 0px; width: 32px; background-color: rgb(51, 51, "
+    "51)}"
+    "QScrollBar::up-arrow:vertical {height: 0px}QScrollBar::down-arrow:vertical{height: 0px}"
+    "QScrollBar::add-line:vertical {height: 0px}QScrollBar::sub-line:vertical {height: 0px}"
+    "QScrollBar::handle:vertical {min-height: 42px}";
+
+} // namespace
+
+QPointer<QWidget> KSScrollViewerWidget::s_mainWnd;
+QString KSScrollViewerWidget::s_scrollBarStyle =
+    QStringLiteral("QScrollArea { background-color: rgb(51, 51, 51); border: 0px; }");
+
+KSScrollViewerWidget::KSScrollViewerWidget(QWidget* parent)
+    : QScrollArea(parent)
+    , m_board(new ScrollViewerBoard(this))
+    , m_flick(this)
+    , m_drag(std::make_unique<ScrollViewerDrag>(*m_board))
+{
+    setFrameShape(QFrame::NoFrame);
+    setStyleSheet(s_scrollBarStyle);
+    setAttribute(Qt::WA_AcceptTouchEvents);
+    viewport()->setAttribute(Qt::WA_AcceptTouchEvents);
+    setWidget(m_board->panel());
+    buildBars();
+
+    m_press.hold.setSingleShot(true);
+    m_press.popup.setSingleShot(true);
+    connect(&m_press.hold, &TouchTimer::timeout, this, &KSScrollViewerWidget::slotHandleMenuTimer);
+    connect(&m_press.popup, &TouchTimer::timeout, this, &KSScrollViewerWidget::slotShowPopupItem);
+    connect(&m_drag->edgeTimer, &TouchTimer::timeout, this, &KSScrollViewerWidget::slotHandleMoveTimer);
+    connect(&m_stretchTimer, &TouchTimer::timeout, this, &KSScrollViewerWidget::slotHandleStretchTimer);
+    connect(m_board, &ScrollViewerBoard::itemDestroyed, this, &KSScrollViewerWidget::itemGone);
+
+    installEventFilter(this);
+    viewport()->installEventFilter(this);
+    m_board->board()->installEventFilter(this);
+    m_bar->installEventFilter(this);
+    setSize(DEFAULT_WIDTH, DEFAULT_HEIGHT);
+    setHEffectiveArea(0, DEFAULT_WIDTH);
+    adjustLayout();
+}
+
+KSScrollViewerWidget::~KSScrollViewerWidget()
+{
+    disconnect(m_board, nullptr, this, nullptr);
+    for (KSBaseItemWidget* item : m_board->items())
+        disconnectItem(item);
+    m_drag.reset();
+}
+
+void KSScrollViewerWidget::buildBars()
+{
+    setHorizontalScrollBarPolicy(Qt::ScrollBarAlwaysOff);
+    setVerticalScrollBarPolicy(Qt::ScrollBarAlwaysOff);
+    m_bar = new KSScrollBar(Qt::Vertical, viewport());
+    m_bar->setStyleSheet(QString::fromLatin1(BAR_STYLE));
+    m_bar->move(BAR_LEFT, 0);
+    m_bar->setFixedWidth(BAR_WIDTH);
+    m_bar->hide();
+    connect(verticalScrollBar(), &QScrollBar::valueChanged, m_bar, &QScrollBar::setValue);
+    connect(m_bar, &QScrollBar::valueChanged, this, &KSScrollViewerWidget::slotSetScrollBarValue);
+    connect(m_bar, &QScrollBar::rangeChanged, this, &KSScrollViewerWidget::slotScrollBarShowOrHide);
+    connect(m_bar, &QScrollBar::sliderPressed, this, &KSScrollViewerWidget::slotScrollBarSliderPressed);
+}
+
+void KSScrollViewerWidget::setSize(int width, int height)
+{
+    setFixedSize(width, height);
+    m_board->setWidths(width, width - m_spacingToBar - BAR_WIDTH);
+    m_bar->setFixedSize(BAR_WIDTH, viewport()->height());
+    applyBarAlignment();
+    adjustLayout();
+}
+
+int KSScrollViewerWidget::getSpacingBetweenItemAndScrollbar() const
+{
+    return m_spacingToBar;
+}
+
+void KSScrollViewerWidget::setSpacingBetweenItemAndScrollbar(int spacing)
+{
+    m_spacingToBar = qMax(spacing, 0);
+    setSize(width(), height());
+}
+
+void KSScrollViewerWidget::setVScrollBarAlignment(Qt::Alignment alignment)
+{
+    if (alignment != Qt::AlignLeft && alignment != Qt::AlignRight)
+        return;
+    m_barAlignment = alignment;
+    applyBarAlignment();
+}
+
+void KSScrollViewerWidget::applyBarAlignment()
+{
+    if (m_barAlignment == Qt::AlignRight) {
+        m_bar->move(width() - BAR_WIDTH, 0);
+        m_board->board()->move(0, 0);
+    } else {
+        m_bar->move(0, 0);
+        m_board->board()->move(m_spacingToBar + BAR_WIDTH, 0);
+    }
+    m_bar->raise();
+}
+
+void KSScrollViewerWidget::setSpacingBetweenItems(int spacing)
+{
+    m_board->setSpacing(spacing);
+    adjustLayout();
+}
+
+void KSScrollViewerWidget::setMargins(QMargins margins)
+{
+    m_board->setMargins(margins);
+    adjustLayout();
+}
+
+void KSScrollViewerWidget::setMargins(int left, int top, int right, int bottom)
+{
+    setMargins(QMargins(left, top, right, bottom));
+}
+
+void KSScrollViewerWidget::setItemsDragFlagAlignment(DragFlagAlignment alignment)
+{
+    m_dragAlignment = alignment;
+}
+
+void KSScrollViewerWidget::setScrollBarAutoShow(bool autoShow)
+{
+    m_barAutoShow = autoShow;
+    slotScrollBarShowOrHide(m_bar->minimum(), m_bar->maximum());
+}
+
+void KSScrollViewerWidget::setHasSeparator(bool hasSeparator)
+{
+    m_hasSeparator = hasSeparator;
+    m_board->board()->update();
+}
+
+void KSScrollViewerWidget::setHEffectiveArea(int left, int width)
+{
+    m_effectiveLeft = left;
+    m_effectiveWidth = width;
+}
+
+void KSScrollViewerWidget::connectItem(KSBaseItemWidget* item)
+{
+    if (item->getDragFlagAlignment() == DRAGFLAG_NONE)
+        item->setDragFlagAlignment(m_dragAlignment);
+    item->setAttribute(Qt::WA_AcceptTouchEvents);
+    item->installEventFilter(this);
+    connect(item, &KSBaseItemWidget::signalResize, this, &KSScrollViewerWidget::slotHandleItemSizeChange,
+            Qt::UniqueConnection);
+    connect(item, &KSBaseItemWidget::signalStartMove, this, &KSScrollViewerWidget::slotStartDrag,
+            Qt::UniqueConnection);
+    if (m_itemsCanDrag)
+        item->setDragFlag(true);
+    item->show();
+}
+
+void KSScrollViewerWidget::disconnectItem(KSBaseItemWidget* item)
+{
+    item->removeEventFilter(this);
+    disconnect(item, nullptr, this, nullptr);
+}
+
+void KSScrollViewerWidget::addWidgetItem(KSBaseItemWidget* item, int index)
+{
+    if (!item || m_board->indexOf(item) >= 0)
+        return;
+    if (m_drag->item() == item)
+        abandonDrag();
+    m_board->insert(item, index);
+    connectItem(item);
+    adjustLayout();
+}
+
+void KSScrollViewerWidget::addWidgetItems(QList<KSBaseItemWidget*>* items, int index)
+{
+    if (!items)
+        return;
+    if (index < 0 || index > count())
+        index = count();
+    for (KSBaseItemWidget* item : *items) {
+        if (!item || m_board->indexOf(item) >= 0 || m_drag->item() == item)
+            continue;
+        m_board->insert(item, index++);
+        connectItem(item);
+    }
+    adjustLayout();
+}
+
+void KSScrollViewerWidget::removeWidgetItem(KSBaseItemWidget* item)
+{
+    if (item && m_drag->item() == item) {
+        abandonDrag();
+        disconnectItem(item);
+        adjustLayout();
+        return;
+    }
+    removeWidgetItems(m_board->indexOf(item), 1);
+}
+
+void KSScrollViewerWidget::removeWidgetItem(int index)
+{
+    removeWidgetItems(index, 1);
+}
+
+void KSScrollViewerWidget::removeWidgetItems(int index, int count)
+{
+    if (index < 0 || index >= this->count() || count <= 0)
+        return;
+    const QList<KSBaseItemWidget*> gone = itemsOf(index, count);
+    for (KSBaseItemWidget* item : gone) {
+        disconnectItem(item);
+        m_board->take(item);
+        item->hide();
+        if (m_press.item == item) {
+            m_press.clearItem();
+            m_press.stopTimers();
+            m_press.drop();
+        }
+    }
+    adjustLayout();
+}
+
+void KSScrollViewerWidget::removeWidgetItems(KSBaseItemWidget* item, int count)
+{
+    removeWidgetItems(m_board->indexOf(item), count);
+}
+
+void KSScrollViewerWidget::removeAll()
+{
+    if (KSBaseItemWidget* lifted = m_drag->item()) {
+        abandonDrag();
+        disconnectItem(lifted);
+    }
+    if (isEmpty())
+        adjustLayout();
+    removeWidgetItems(0, count());
+}
+
+// Only what is left of it, a QObject.
+void KSScrollViewerWidget::itemGone(QObject*)
+{
+    adjustLayout();
+}
+
+void KSScrollViewerWidget::swap(KSBaseItemWidget* first, KSBaseItemWidget* second)
+{
+    swap(m_board->indexOf(first), m_board->indexOf(second));
+}
+
+void KSScrollViewerWidget::swap(int first, int second)
+{
+    if (!m_board->at(first) || !m_board->at(second) || first == second)
+        return;
+    m_board->swap(first, second);
+    adjustLayout();
+}
+
+int KSScrollViewerWidget::count() const
+{
+    return m_board->count();
+}
+
+bool KSScrollViewerWidget::isEmpty() const
+{
+    return m_board->isEmpty();
+}
+
+KSBaseItemWidget* KSScrollViewerWidget::getWidgetItem(int index) const
+{
+    return m_board->at(index);
+}
+
+KSBaseItemWidget* KSScrollViewerWidget::getWidgetItem(QPoint pos) const
+{
+    return m_board->itemInThePos(toBoard(pos));
+}
+
+int KSScrollViewerWidget::getIndexOfWidgetItem(const KSBaseItemWidget* item) const
+{
+    return m_board->indexOf(item);
+}
+
+QList<KSBaseItemWidget*> KSScrollViewerWidget::itemsOf(int first, int number) const
+{
+    return first < 0 ? QList<KSBaseItemWidget*>() : m_board->items().mid(first, number);
+}
+
+QList<KSBaseItemWidget*> KSScrollViewerWidget::getWidgetItems(int index, int count) const
+{
+    return itemsOf(index, qMax(count, 0));
+}
+
+QList<KSBaseItemWidget*> KSScrollViewerWidget::getWidgetItems(QRect rect) const
+{
+    return getItemsIntersectRect(QRect(toBoard(rect.topLeft()), rect.size()));
+}
+
+QList<KSBaseItemWidget*> KSScrollViewerWidget::getItemsIntersectRect(QRect rect) const
+{
+    const ScrollViewerBoard::Range range = m_board->itemsMeeting(rect);
+    return itemsOf(range.first, range.count);
+}
+
+QRect KSScrollViewerWidget::calculateVisibleRect() const
+{
+    return QRect(toBoard(QPoint(0, 0)), viewport()->size());
+}
+
+int KSScrollViewerWidget::getInsertPos(QPoint pos) const
+{
+    const int y = toBoard(pos).y();
+    int index = 0;
+    while (index < count() && m_board->at(index)->geometry().center().y() < y)
+        ++index;
+    return index;
+}
+
+KSBaseItemWidget* KSScrollViewerWidget::getSelectedItem() const
+{
+    return m_press.item;
+}
+
+KSBaseItemWidget* KSScrollViewerWidget::getMoveItem() const
+{
+    return m_drag->moving();
+}
+
+bool KSScrollViewerWidget::isDragging() const
+{
+    return m_drag->isActive();
+}
+
+QPoint KSScrollViewerWidget::toBoard(const QPoint& pos) const
+{
+    return m_board->board()->mapFrom(this, pos);
+}
+
+bool KSScrollViewerWidget::isTall() const
+{
+    return m_board->board()->height() > height();
+}
+
+// With items of no fixed size a relayout resizes them, and they ask for one in turn.
+void KSScrollViewerWidget::adjustLayout()
+{
+    if (m_layingOut)
+        return;
+    const QScopedValueRollback<bool> guard(m_layingOut, true);
+    const int saved = m_savedValue;
+    m_board->relayout();
+    m_savedValue = saved;
+    setScrollBarInfo(m_board->contentsHeight() - viewport()->height(), viewport()->height() + PAGE_EXTRA);
+    refreshVisible();
+}
+
+void KSScrollViewerWidget::setScrollBarInfo(int maximum, int page)
+{
+    const int saved = m_savedValue;
+    verticalScrollBar()->setRange(0, qMax(maximum, 0));
+    verticalScrollBar()->setPageStep(page);
+    m_bar->setRange(0, qMax(maximum, 0));
+    m_bar->setPageStep(page);
+    slotSetScrollBarValue(saved);
+}
+
+void KSScrollViewerWidget::resizeEvent(QResizeEvent* event)
+{
+    QScrollArea::resizeEvent(event);
+    m_bar->setFixedHeight(viewport()->height());
+    setScrollBarInfo(m_board->contentsHeight() - viewport()->height(), viewport()->height() + PAGE_EXTRA);
+    applyBarAlignment();
+    refreshVisible();
+}
+
+void KSScrollViewerWidget::slotHandleItemSizeChange()
+{
+    adjustLayout();
+}
+
+void KSScrollViewerWidget::slotScrollBarShowOrHide(int minimum, int maximum)
+{
+    m_bar->setVisible(!m_barAutoShow || minimum != maximum);
+}
+
+void KSScrollViewerWidget::slotSetScrollBarValue(int value)
+{
+    verticalScrollBar()->setValue(value);
+    m_scrollValue = verticalScrollBar()->value();
+    m_savedValue = m_scrollValue;
+    m_bar->setValue(m_scrollValue);
+    refreshVisible();
+    if (m_drag->isActive())
+        updateIndicator();
+}
+
+void KSScrollViewerWidget::changeScrollBarValue(int offset)
+{
+    slotSetScrollBarValue(
+        FlickMotion::scrolledValue(m_scrollValue, offset, m_bar->minimum(), m_bar->maximum()));
+}
+
+void KSScrollViewerWidget::refreshVisible()
+{
+    const ScrollViewerBoard::Range range = m_board->itemsMeeting(calculateVisibleRect());
+    if (range.first == m_firstVisible && range.last() == m_lastVisible)
+        return;
+    m_firstVisible = range.first;
+    m_lastVisible = range.last();
+    Q_EMIT signalVisibleItemsChange();
+}
+
+void KSScrollViewerWidget::moveToWidgetItem(int index)
+{
+    const KSBaseItemWidget* item = m_board->at(index);
+    if (item)
+        slotSetScrollBarValue(index == 0 ? 0 : qBound(m_bar->minimum(), item->y(), m_bar->maximum()));
+}
+
+void KSScrollViewerWidget::moveToWidgetItem(KSBaseItemWidget* item)
+{
+    moveToWidgetItem(m_board->indexOf(item));
+}
+
+void KSScrollViewerWidget::setLastVisibleItem(int index)
+{
+    const KSBaseItemWidget* item = m_board->at(index);
+    if (item)
+        slotSetScrollBarValue(qMax(item->geometry().bottom() + 1 - height(), m_bar->minimum()));
+}
+
+void KSScrollViewerWidget::setLastVisibleItem(KSBaseItemWidget* item)
+{
+    setLastVisibleItem(m_board->indexOf(item));
+}
+
+void KSScrollViewerWidget::wheelEvent(QWheelEvent* event)
+{
+    stopFlick();
+    m_barPressed = true;
+    m_stretchTimer.stop();
+    refreshVisible();
+    event->accept();
+    const QList<KSBaseItemWidget*> shown = getWidgetItems(rect());
+    if (shown.isEmpty())
+        return;
+    const QScrollBar* area = verticalScrollBar();
+    int index = m_board->indexOf(shown.constFirst());
+    const int delta = event->angleDelta().y();
+    const int value = area->value();
+    if (delta < 0 && value != area->maximum()) {
+        wheelChange(true, index + 1);
+    } else if (delta > 0 && value != area->minimum()) {
+        const QPoint origin = shown.constFirst()->mapTo(this, QPoint(0, 0));
+        if (value != area->maximum() || rect().contains(origin))
+            --index;
+        wheelChange(value > 1, index);
+    } else {
+        wheelChange(false, index);
+    }
+}
+
+void KSScrollViewerWidget::wheelChange(bool move, int index)
+{
+    if (move)
+        moveToWidgetItem(qMax(index, 0));
+    Q_EMIT signalVisibleItemsChange();
+}
+
+void KSScrollViewerWidget::keyPressEvent(QKeyEvent* event)
+{
+    switch (event->key()) {
+    case Qt::Key_Up:
+    case Qt::Key_Down:
+    case Qt::Key_Left:
+    case Qt::Key_Right:
+    case Qt::Key_PageUp:
+    case Qt::Key_PageDown:
+        event->accept();
+        break;
+    default:
+        QAbstractScrollArea::keyPressEvent(event);
+        break;
+    }
+}
+
+bool KSScrollViewerWidget::focusNextPrevChild(bool)
+{
+    return true;
+}
+
+void KSScrollViewerWidget::slotChangeScrollBarStyle(int minimum, int maximum)
+{
+    const QString part =
+        minimum == maximum
+            ? QStringLiteral(
+                  "QScrollBar::handle:vertical {background-image: url(:/back);background-position: "
+                  "center;width: 20px}")
+            : QStringLiteral("QScrollBar::handle:vertical {background-image: url(:/control);"
+                             "background-position: center;width: 14px}");
+    // Repeating the last rule would change nothing but the length.
+    if (!s_scrollBarStyle.endsWith(part))
+        s_scrollBarStyle += part;
+}
+
+void KSScrollViewerWidget::slotScrollBarSliderPressed()
+{
+    m_barPressed = true;
+    m_stretchTimer.stop();
+}
+
+bool KSScrollViewerWidget::setMinitrimStatus(bool status)
+{
+    return std::exchange(m_minitrim, status);
+}
+
+void KSScrollViewerWidget::slotHandleStretchTimer()
+{
+    const KSBaseItemWidget* item = m_board->itemInThePos(toBoard(QPoint(width() / 2, 0)));
+    if (item && verticalScrollBar()->value() != verticalScrollBar()->maximum())
+        slotSetScrollBarValue(item->y());
+    Q_EMIT minitrimStop();
+}

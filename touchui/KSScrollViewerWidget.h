@@ -1,0 +1,256 @@
+#pragma once
+
+#include "touchui/KSBaseItemWidget.h"
+#include "touchui/ScrollViewerFlick.h"
+#include "touchui/ScrollViewerPress.h"
+
+#include <QList>
+#include <QMargins>
+#include <QPoint>
+#include <QPointF>
+#include <QPointer>
+#include <QRect>
+#include <QScrollArea>
+
+#include <memory>
+#include <optional>
+
+class KSScrollBar;
+class QTouchEvent;
+class ScrollViewerBoard;
+class ScrollViewerDrag;
+
+// A vertical list of items for one finger, which taps or holds an item, scrolls the list and flicks it on,
+// or, by an item's handle, lifts the item out and drops it at another place.
+//
+// Every kind of press is told by a signal with the item (null in empty area), a position and this list.
+// Positions in signals are the item's, or this widget's when there is no item. A mouse does the same as a
+// finger, but its list follows at once and does not run on. Items belong to the list as its descendants; one
+// that is removed stays hidden as such, so that it can be put back. GUI thread only.
+class KSScrollViewerWidget : public QScrollArea
+{
+    Q_OBJECT
+public:
+    // Where a lifted item floats. Not owned; null: the window of the list.
+    static QPointer<QWidget> s_mainWnd;
+    // The style sheet of the next list that is made.
+    static QString s_scrollBarStyle;
+
+    explicit KSScrollViewerWidget(QWidget* parent = nullptr);
+    ~KSScrollViewerWidget() override;
+
+    // Fixes the size of the list; 543 by 998 at first.
+    void setSize(int width, int height);
+
+    virtual int getSpacingBetweenItemAndScrollbar() const;
+    // Left or right; others are ignored.
+    virtual void setVScrollBarAlignment(Qt::Alignment alignment);
+    virtual void setSpacingBetweenItems(int spacing);
+    virtual void setMargins(QMargins margins);
+    virtual void setMargins(int left, int top, int right, int bottom);
+    // For items that have none of their own.
+    virtual void setItemsDragFlagAlignment(DragFlagAlignment alignment);
+    // The bar shows only while there is something to scroll to.
+    virtual void setScrollBarAutoShow(bool autoShow);
+    virtual void setHasSeparator(bool hasSeparator);
+    virtual void setSpacingBetweenItemAndScrollbar(int spacing);
+    // -1 or an index beyond the end appends. Null, and items that are in the list already, are ignored.
+    virtual void addWidgetItem(KSBaseItemWidget* item, int index);
+    // The list object stays the caller's.
+    virtual void addWidgetItems(QList<KSBaseItemWidget*>* items, int index);
+    // The item is hidden and stays a descendant of the list. What is not in the list is ignored.
+    virtual void removeWidgetItem(KSBaseItemWidget* item);
+    virtual void removeWidgetItem(int index);
+    // So many items from the one on; more than there are means all of them.
+    virtual void removeWidgetItems(int index, int count);
+    virtual void removeWidgetItems(KSBaseItemWidget* item, int count);
+    virtual void removeAll();
+    virtual void swap(KSBaseItemWidget* first, KSBaseItemWidget* second);
+    virtual void swap(int first, int second);
+    virtual int count() const;
+    virtual bool isEmpty() const;
+    // Scrolls so that the item is the topmost one, as far as the range goes.
+    virtual void moveToWidgetItem(int index);
+    virtual void moveToWidgetItem(KSBaseItemWidget* item);
+    // Scrolls so that the item is the lowest one.
+    virtual void setLastVisibleItem(int index);
+    virtual void setLastVisibleItem(KSBaseItemWidget* item);
+    // The widget that floats under the finger; null when nothing is lifted.
+    virtual KSBaseItemWidget* getMoveItem() const;
+    // Switched off, the list does not follow the finger that is down; the next touch switches it on.
+    virtual void setFlickAbility(bool ability);
+    // Presses beside it, in widget coordinates, select nothing.
+    virtual void setHEffectiveArea(int left, int width);
+    virtual void onTranslateTouchEventToMouse(QObject* object, QTouchEvent* event);
+    virtual void onTranslateTouchBeginEventToMouse(QObject* object, QTouchEvent* event, QPoint& pos);
+    virtual void onTranslateTouchUpdateEventToMouse(QObject* object, QTouchEvent* event, QPoint& pos);
+    virtual void onTranslateTouchEndEventToMouse(QObject* object, QTouchEvent* event, QPoint& pos);
+    // Follows the finger. True when the event belongs to the motion and goes no further.
+    virtual bool onTouchEvent(QObject* object, QTouchEvent* event);
+    // One tick: how far the contents move.
+    virtual QPointF getDistance();
+    virtual void setAutoFlick(bool autoFlick);
+    virtual void setStartPoint(const QPointF& point);
+    virtual void setEndPoint(const QPointF& point);
+    virtual bool isFlickEnd() const;
+    virtual bool hasFlicked() const;
+    virtual void stopFlick();
+    // The list runs on after the finger has left.
+    virtual bool isAutoFilck() const;
+    virtual bool flickAbility() const;
+
+    KSBaseItemWidget* getWidgetItem(int index) const;
+    // In widget coordinates; null in a gap.
+    KSBaseItemWidget* getWidgetItem(QPoint pos) const;
+    int getIndexOfWidgetItem(const KSBaseItemWidget* item) const;
+    QList<KSBaseItemWidget*> getWidgetItems(int index, int count) const;
+    // In widget coordinates.
+    QList<KSBaseItemWidget*> getWidgetItems(QRect rect) const;
+    // In board coordinates.
+    QList<KSBaseItemWidget*> getItemsIntersectRect(QRect rect) const;
+    // What is to be seen, in board coordinates.
+    QRect calculateVisibleRect() const;
+    // The index of an item that is inserted at this place, in widget coordinates.
+    int getInsertPos(QPoint pos) const;
+    // The item of the last press.
+    KSBaseItemWidget* getSelectedItem() const;
+    // Items that are at least partly to be seen; -1 when there are none.
+    int firstVisibleItem() const { return m_firstVisible; }
+    int lastVisibleItem() const { return m_lastVisible; }
+    bool isMove() const;
+    bool isDragging() const;
+    // Restarts those timers of press and drag that run.
+    void allTimersReset();
+    void stopTapAndHoldTimer();
+    KSScrollBar* getVScrollBar() const { return m_bar; }
+    Qt::Alignment getVScrollBarAlignment() const { return m_barAlignment; }
+    bool getHasSeparator() const { return m_hasSeparator; }
+    // Gives the old one.
+    bool setMinitrimStatus(bool status);
+    // While set, a touch is left to the item under it.
+    void setIsTake(bool isTake) { m_isTake = isTake; }
+    bool itemsCanDrag() const { return m_itemsCanDrag; }
+
+    bool eventFilter(QObject* object, QEvent* event) override;
+
+public Q_SLOTS:
+    void slotStartDrag(KSBaseItemWidget* item);
+    void slotItemsCanDrag(bool canDrag);
+    void slotHandleStretchTimer();
+    void slotHandleMenuTimer();
+    void slotHandleMoveTimer();
+    void slotChangeScrollBarStyle(int minimum, int maximum);
+    void slotHandleItemSizeChange();
+    void slotScrollBarShowOrHide(int minimum, int maximum);
+    void slotSetScrollBarValue(int value);
+    void slotScrollBarSliderPressed();
+    void slotShowPopupItem();
+
+Q_SIGNALS:
+    // A tap on an item.
+    void widgetItemClicked(KSBaseItemWidget* item, QPoint pos, KSScrollViewerWidget* scrollArea);
+    void widgetItemPressed(KSBaseItemWidget* item, QPoint pos, KSScrollViewerWidget* scrollArea);
+    // The end of a press without motion.
+    void widgetItemReleased(KSBaseItemWidget* item, QPoint pos, KSScrollViewerWidget* scrollArea);
+    void widgetItemLongHold(KSBaseItemWidget* item, QPoint pos, KSScrollViewerWidget* scrollArea);
+    // For subclasses; not emitted here.
+    void widgetItemPressedAndHold(KSBaseItemWidget* item, QPoint pos, KSScrollViewerWidget* scrollArea,
+                                  bool& willFlick);
+    void widgetItemRightPressed(KSBaseItemWidget* item, QPoint pos, KSScrollViewerWidget* scrollArea);
+    // Before the item leaves the list.
+    void signalDragOneItem(KSBaseItemWidget* item, int index, KSScrollViewerWidget* scrollArea);
+    // A press on an item has become a motion. Who sets willFlick makes it one that ends in no tap.
+    void signalFlick(KSBaseItemWidget* item, QPoint pos, KSScrollViewerWidget* scrollArea, bool& willFlick);
+    void minitrimStop();
+    void signalVisibleItemsChange();
+    // After a drop, when all items have their places.
+    void signalItemDrop();
+    void widgetItemMouseMove(KSBaseItemWidget* item, QPoint pos, KSScrollViewerWidget* scrollArea);
+    // The end of a press with motion.
+    void widgetItemChangeColor(KSBaseItemWidget* item, QPoint pos, KSScrollViewerWidget* scrollArea);
+
+protected:
+    void timerEvent(QTimerEvent* event) override;
+    void mousePressEvent(QMouseEvent* event) override;
+    void mouseMoveEvent(QMouseEvent* event) override;
+    void mouseReleaseEvent(QMouseEvent* event) override;
+    void wheelEvent(QWheelEvent* event) override;
+    void keyPressEvent(QKeyEvent* event) override;
+    void resizeEvent(QResizeEvent* event) override;
+    // A hidden list has no finger on it.
+    void hideEvent(QHideEvent* event) override;
+    bool focusNextPrevChild(bool next) override;
+
+    // A subclass may start it.
+    TouchTimer m_stretchTimer;
+
+private:
+    // Layout
+    void buildBars();
+    void adjustLayout();
+    void setScrollBarInfo(int maximum, int page);
+    void applyBarAlignment();
+    void connectItem(KSBaseItemWidget* item);
+    void disconnectItem(KSBaseItemWidget* item);
+    void itemGone(QObject* item);
+    void refreshVisible();
+    void changeScrollBarValue(int offset);
+    void wheelChange(bool move, int index);
+    QPoint toBoard(const QPoint& pos) const;
+    bool isTall() const;
+    QList<KSBaseItemWidget*> itemsOf(int first, int count) const;
+
+    // Touch
+    bool handleVScrollBarEvent(QEvent* event);
+    void handleScrollBarPressedEvent(QEvent* event);
+    bool handleTouchEventFilter(QObject* object, QEvent* event);
+    void handleFlickBeginEvent(QObject* object, const QPoint& pos);
+    bool isOtherItemTouchWhenGraping(QObject* object, QEvent* event) const;
+    void cancelTouch();
+
+    // Press
+    void beginPress(int touchId, const QPoint& pos, Qt::MouseButton button);
+    bool isItemDragAreaPressed() const;
+    void handleItemPressedEvent(QMouseEvent* event);
+    void handleAreaPressedEvent(QMouseEvent* event);
+    void startHold(const wchar_t* tag);
+    void JudgeHaveMoveNow(const QPoint& pos);
+    void moveAll(const QPoint& pos);
+    void handleMovement(const QPoint& pos);
+    void endPress(const QPoint& pos);
+    void MouseReleaseSingal(const QPoint& pos);
+    void MouseReleaseChangeColorSingal(const QPoint& pos);
+    std::optional<FlickMotion::DragBounds> dragBounds() const;
+    bool isInsidePressedItem(const QPoint& pos) const;
+
+    // Drag
+    void startDrag();
+    void moveDragItem(const QPoint& pos);
+    void updateIndicator();
+    void dropItem();
+    void handleDropItemWhenRelease();
+    void abandonDrag();
+
+    ScrollViewerBoard* m_board;
+    KSScrollBar* m_bar = nullptr;
+    ScrollViewerFlick m_flick;
+    ScrollViewerPress m_press;
+    std::unique_ptr<ScrollViewerDrag> m_drag;
+    Qt::Alignment m_barAlignment = Qt::AlignLeft;
+    DragFlagAlignment m_dragAlignment = DRAGFLAG_NONE;
+    int m_firstVisible = -1;
+    int m_lastVisible = -1;
+    int m_savedValue = 0;
+    int m_scrollValue = 0; // what the motion works from
+    int m_effectiveLeft = 0;
+    int m_effectiveWidth = 0;
+    int m_spacingToBar = 6;
+    bool m_savedMinitrim = false;
+    bool m_minitrim = true;
+    bool m_itemsCanDrag = false;
+    bool m_barPressed = false;
+    bool m_barAutoShow = true;
+    bool m_hasSeparator = true;
+    bool m_isTake = false;
+    bool m_layingOut = false;
+};

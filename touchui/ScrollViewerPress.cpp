@@ -1,0 +1,46 @@
+#include "touchui/ScrollViewerPress.h"
+
+#include "touchui/FlickMotion.h"
+
+void ScrollViewerPress::begin(int id, const QPoint& position, int value)
+{
+    hold.stop();
+    popup.stop();
+    touchId = id;
+    press = position;
+    last = position;
+    valueAtPress = value;
+    moved = false;
+    outOfBounds = false;
+    dragAreaPressed = false;
+    positionInItem = QPoint(-1, -1);
+}
+
+void ScrollViewerPress::clearItem()
+{
+    item.clear();
+    index = -1;
+}
+
+void ScrollViewerPress::stopTimers()
+{
+    hold.stop();
+    popup.stop();
+}
+
+bool ScrollViewerPress::isBeyondSlop(const QPoint& position) const
+{
+    const int slop = touchId == MOUSE_TOUCH ? FlickMotion::MOUSE_SLOP : FlickMotion::TOUCH_SLOP;
+    return FlickMotion::isBeyondSlop(press, position, slop);
+}
+
+void ScrollViewerPress::calculateBounds(int itemHeight, int viewerHeight)
+{
+    if (!item) {
+        upperBound = 0;
+        lowerBound = viewerHeight - 1;
+        return;
+    }
+    upperBound = positionInItem.y();
+    lowerBound = viewerHeight - (itemHeight - positionInItem.y());
+}
