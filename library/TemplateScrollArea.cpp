@@ -1,6 +1,7 @@
 #include "library/TemplateScrollArea.h"
 
 #include "touchui/FlickMotion.h"
+#include "touchui/KSScrollBar.h"
 
 #include <QApplication>
 #include <QMouseEvent>
@@ -17,6 +18,13 @@ namespace
 {
 
 constexpr FlickMotion::Rules RULES = FlickMotion::templateGrid();
+
+// Narrower than in other lists: four columns and the bar fill the area.
+const char SCROLL_BAR_STYLE[] =
+    "QScrollBar:vertical { margin: 0px; border: 0px; width: 27px; background-color: rgb(51, 51, 51) }"
+    "QScrollBar::up-arrow:vertical { height: 0px } QScrollBar::down-arrow:vertical { height: 0px }"
+    "QScrollBar::add-line:vertical { height: 0px } QScrollBar::sub-line:vertical { height: 0px }"
+    "QScrollBar::handle:vertical { min-height: 42px }";
 
 std::optional<QEventPoint> pointOf(const QTouchEvent& event, int id)
 {
@@ -38,6 +46,8 @@ bool isTouch(QEvent::Type type)
 TemplateScrollArea::TemplateScrollArea(QWidget* parent) : QScrollArea(parent)
 {
     setFrameShape(QFrame::NoFrame);
+    setVerticalScrollBar(new KSScrollBar(Qt::Vertical));
+    verticalScrollBar()->setStyleSheet(QString::fromLatin1(SCROLL_BAR_STYLE));
     setHorizontalScrollBarPolicy(Qt::ScrollBarAlwaysOff);
     setFocusPolicy(Qt::NoFocus);
 }

@@ -1,9 +1,9 @@
 #include "library/TitlerTabWidget.h"
 
 #include "canvas/DrawBoundingRectangle.h"
+#include "touchui/KSTabBar.h"
 
 #include <QPainter>
-#include <QTabBar>
 
 namespace
 {
@@ -14,7 +14,7 @@ constexpr QColor DIALOG_COLOR(51, 51, 51);
 
 } // namespace
 
-TitlerTabWidget::TitlerTabWidget(QWidget* parent) : QTabWidget(parent)
+TitlerTabWidget::TitlerTabWidget(QWidget* parent) : KSTabWidget(parent)
 {
 }
 
@@ -28,7 +28,7 @@ void TitlerTabWidget::setPainLine(int x, int y)
 
 void TitlerTabWidget::paintEvent(QPaintEvent* event)
 {
-    QTabWidget::paintEvent(event);
+    KSTabWidget::paintEvent(event);
     QPainter painter(this);
     painter.drawPixmap(mFrameX, mFrameY, mFrame);
     painter.fillRect(0, 0, width(), tabBar()->height() - TAB_OVERLAP, DIALOG_COLOR);

@@ -1,10 +1,11 @@
 // The tabs of a picker, with the frame of a list pane drawn in their page.
 #pragma once
 
-#include <QPixmap>
-#include <QTabWidget>
+#include "touchui/KSTabWidget.h"
 
-class TitlerTabWidget : public QTabWidget
+#include <QPixmap>
+
+class TitlerTabWidget : public KSTabWidget
 {
     Q_OBJECT
 
