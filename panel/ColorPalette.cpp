@@ -312,9 +312,10 @@ void ColorPalette::showMessageMask(bool show)
 
 void ColorPalette::showMask(QWidget*& mask, bool show)
 {
-    if (!mask)
+    if (!mask && show)
         mask = createMask();
-    mask->setVisible(show);
+    if (mask)
+        mask->setVisible(show);
 }
 
 QWidget* ColorPalette::createMask()

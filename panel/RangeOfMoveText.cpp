@@ -4,6 +4,7 @@
 #include "touchui/KSPushbutton.h"
 #include "touchui/KSRadiobutton.h"
 
+#include <QGridLayout>
 #include <QHBoxLayout>
 #include <QLabel>
 #include <QVBoxLayout>
@@ -28,9 +29,9 @@ constexpr int TWO_PIXELS_ID = 0;
 constexpr int TEN_PIXELS_ID = 1;
 const char RADIO_PICTURES[] = ":/RadioButton";
 constexpr int ROW_SPACING = 24;
-constexpr int LABEL_SPACING = 10;
-constexpr int RANGE_LABEL_WIDTH = 80;
-constexpr int SPACING_BEFORE_CROSS = 20;
+constexpr int LABEL_SPACING = 8;
+constexpr int RANGE_WIDTH = 110;
+constexpr int RANGE_LABEL_WIDTH = 62;
 
 template <typename Layout>
 Layout* newLayout()
@@ -59,11 +60,7 @@ RangeOfMoveText::RangeOfMoveText(QWidget* parent) : ToolBox(parent)
     m_tenPixels = addRangeChoice(TEN_PIXELS_ID);
     m_twoPixels.button->setChecked(true);
 
-    auto* row = newLayout<QHBoxLayout>();
-    row->addLayout(createRangeBlock());
-    row->addSpacing(SPACING_BEFORE_CROSS);
-    row->addLayout(createCross());
-    setLayout(row);
+    createLayout();
     translateText();
 }
 
@@ -81,21 +78,24 @@ RangeOfMoveText::RangeChoice RangeOfMoveText::addRangeChoice(int id)
     return choice;
 }
 
-QLayout* RangeOfMoveText::createRangeBlock()
+// The description stands in the corner over the left arm of the cross, the choices below it.
+void RangeOfMoveText::createLayout()
 {
-    auto* column = newLayout<QVBoxLayout>();
-    column->addWidget(m_description);
+    auto* grid = newLayout<QGridLayout>();
+    grid->setColumnMinimumWidth(0, RANGE_WIDTH);
+    grid->addLayout(createCross(), 0, 1, 5, 1);
+    grid->addWidget(m_description, 0, 0, 1, 2, Qt::AlignLeft);
+    int row = 1;
     for (const RangeChoice& choice : {m_twoPixels, m_tenPixels}) {
-        auto* row = newLayout<QHBoxLayout>();
-        row->addWidget(choice.button);
-        row->addSpacing(LABEL_SPACING);
-        row->addWidget(choice.label);
-        row->addStretch();
-        column->addSpacing(ROW_SPACING);
-        column->addLayout(row);
+        auto* line = newLayout<QHBoxLayout>();
+        line->addWidget(choice.button);
+        line->addSpacing(LABEL_SPACING);
+        line->addWidget(choice.label);
+        line->addStretch();
+        grid->setRowMinimumHeight(row++, ROW_SPACING);
+        grid->addLayout(line, row++, 0);
     }
-    column->addStretch();
-    return column;
+    setLayout(grid);
 }
 
 QLayout* RangeOfMoveText::createCross()

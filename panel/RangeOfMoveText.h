@@ -55,7 +55,7 @@ private:
     };
 
     RangeChoice addRangeChoice(int id);
-    QLayout* createRangeBlock();
+    void createLayout();
     QLayout* createCross();
     void moveChanged(int buttonId);
     void rangeReleased(int buttonId);

@@ -26,7 +26,7 @@ namespace
 
 constexpr int BOLD_ROW_SPACING = 24;
 constexpr int LEFT_MARGIN = 40; // the panel begins under the tools bar, left of the window's separator
-constexpr int BLOCK_SPACING = 38;
+constexpr int BLOCK_SPACING = 60;
 const char DEFAULT_FAMILY[] = "KST";
 
 template <typename Layout>
