@@ -25,6 +25,7 @@
 #include "touchui/KSInputContext.h"
 #include "touchui/KSMenu.h"
 #include "touchui/KSPushbutton.h"
+#include "touchui/KSScrollViewerWidget.h"
 #include "touchui/KSToolTip.h"
 
 #include <QAction>
@@ -84,6 +85,7 @@ TitlerWindow::TitlerWindow(bool deferArchiveList, QWidget* parent)
     setAppDefaultParameter();
     setAttribute(Qt::WA_AcceptTouchEvents);
     KSMenu::setMainWindow(this);
+    KSScrollViewerWidget::s_mainWnd = this;
     ICanvasHost::setInstance(this);
     MessageBoxController::setProvider(
         []() -> MessageBoxController* { return ShowMessageController::getInstance(); },
@@ -118,6 +120,7 @@ TitlerWindow::~TitlerWindow()
     KSToolTip::s_mainWindow = nullptr;
     Balloon::s_ParentWindow = nullptr;
     KSMenu::setMainWindow(nullptr);
+    KSScrollViewerWidget::s_mainWnd.clear();
     delete mArchiveList;
     delete mGraphicsView;
     delete mCanvasScene;

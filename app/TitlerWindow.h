@@ -123,6 +123,7 @@ public slots:
     void slotCanvasButtonClicked(QAction* action);
     void slotStartPasteArchive();
     void slotStartCreateNewArchiveFromTemplate(Archive* archiveData);
+    void listWidgetReleasedEvent(KSBaseItemWidget* item, QPoint point, KSScrollViewerWidget* viewer);
     void setHasMessageToShowInformation(bool isNeedShow, QString defaultFont);
 
     // Lock reporting.

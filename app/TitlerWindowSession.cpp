@@ -95,6 +95,8 @@ void TitlerWindow::showTemplateDialog()
 void TitlerWindow::closeTitlerWindow()
 {
     mArchiveList->stopArchiveListTapAndHoldTimer();
+    slotCancelArchiveListMoveMode(); // what is being dragged gets its place while the folder is open
+    mArchiveList->slotHideOptionMenu();
     const QString path = mArchiveList->getCurrentPath();
     saveCurrentTitle();
     clearUndoStack();
@@ -246,6 +248,11 @@ void TitlerWindow::setHasMessageToShowInformation(bool isNeedShow, QString defau
 {
     m_bHasMessage = isNeedShow;
     m_strMessage = std::move(defaultFont);
+}
+
+void TitlerWindow::listWidgetReleasedEvent(KSBaseItemWidget*, QPoint, KSScrollViewerWidget*)
+{
+    hideSoftWareWithOutDeleteEmptyItems();
 }
 
 void TitlerWindow::hideSoftWareWithDeleteEmptyItems()

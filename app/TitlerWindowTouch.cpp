@@ -60,6 +60,8 @@ void TitlerWindow::mousePressEvent(QMouseEvent* event)
 
 bool TitlerWindow::eventFilter(QObject* obj, QEvent* event)
 {
+    if (mArchiveList->getMoveState())
+        return false;
     if (ignoreMouseAndTouchEventWhenArchiveListIsMoveMode(obj, event))
         return true;
     switch (event->type()) {

@@ -70,8 +70,7 @@ void TitlerWindow::connectForTextToolsAndArchiveList()
     connect(mArchiveList, &ArchiveList::cleanUndoStack, this, &TitlerWindow::clearUndoStack);
     connect(mArchiveList, &ArchiveList::archiveListMenuShow, this,
             &TitlerWindow::hideSoftWareWithDeleteEmptyItems);
-    connect(mArchiveList, &ArchiveList::widgetItemReleased, this,
-            &TitlerWindow::hideSoftWareWithOutDeleteEmptyItems);
+    connect(mArchiveList, &ArchiveList::widgetItemReleased, this, &TitlerWindow::listWidgetReleasedEvent);
     connect(mMoveButton, &QPushButton::clicked, this, &TitlerWindow::hideSoftWareWithDeleteEmptyItems);
 }
 

@@ -32,6 +32,10 @@ CANVAS = (609, 97, 1280, 720)
 TOP_WINDOW_MAIN = 2
 LIST_POINT = (380, 130)
 LIST_ROW = 143
+# The option menu opens under the point that was pressed: from there to the middle of its first entry, and on.
+LIST_MENU_ENTRIES = ["Create New", "Copy", "Paste", "Delete", "Save as Template"]
+LIST_MENU_TOP = 50
+LIST_MENU_ROW = 60
 PICTURES = {"_1920.png": (1920, 1080), "_960.png": (960, 540), "_240.png": (240, 135), "_240S.png": (240, 135)}
 
 
@@ -104,7 +108,6 @@ class TitlerTest(unittest.TestCase):
         self.appliance = None
         self.titler = None
         self.programs = []
-        self.copied = False
         self.base = self.provision()
         self.display = self.display_class(os.path.join(self.work, "x"), self.environment)
         self.addCleanup(self.display.stop)
@@ -242,14 +245,11 @@ class TitlerTest(unittest.TestCase):
             20 * SLOW, start, "the end of the session")
 
     def choose_in_list_menu(self, row, entry):
-        """Opens the option menu of the title in this row by a right click and chooses an entry by keys."""
-        x, y = LIST_POINT
-        self.click(x, y + row * LIST_ROW, button=3)
+        """Opens the option menu of the title in this row, one of the upper ones, by a right click and chooses."""
+        x, y = LIST_POINT[0], LIST_POINT[1] + row * LIST_ROW
+        self.click(x, y, button=3)
         self.display.wait_until_still()
-        # The keys step over entries that are disabled: without a copy there is nothing to paste.
-        entries = ["Create New", "Copy", "Paste", "Delete"] if self.copied else ["Create New", "Copy", "Delete"]
-        self.display.xdotool("key", "--delay", "60", *["Down"] * (entries.index(entry) + 1), "Return")
-        self.copied = self.copied or entry == "Copy"
+        self.click(x, y + LIST_MENU_TOP + LIST_MENU_ENTRIES.index(entry) * LIST_MENU_ROW)
         self.display.wait_until_still()
 
     def wait_titles(self, folder, count, timeout=20):
