@@ -6,6 +6,7 @@
 #include "canvas/CanvasScene.h"
 #include "canvas/GraphicsView.h"
 #include "library/ArchiveList.h"
+#include "library/TemplatePicker.h"
 #include "panel/TextToolsPanel.h"
 #include "support/SystemInfo.h"
 #include "touchui/KSPushbutton.h"
@@ -265,6 +266,8 @@ void TitlerWindow::showDialogMaskWidget(bool show)
     setAttribute(Qt::WA_AcceptTouchEvents, !show);
     if (!show || mTextToolsPanel->colorPaletteIsShown())
         mTextToolsPanel->showDialogMaskWidget(show);
+    if (!show || (mTemplatePicker->isVisible() && !mTextToolsPanel->colorPaletteIsShown()))
+        mTemplatePicker->showDialogMaskWidget(show);
 }
 
 void TitlerWindow::showMessageMaskWidget(bool show)
@@ -282,12 +285,15 @@ void TitlerWindow::showMessageMaskWidget(bool show)
     setAttribute(Qt::WA_AcceptTouchEvents, !show && !isDialogMasked);
     if (!show || mTextToolsPanel->colorPaletteIsShown())
         mTextToolsPanel->showMessageMaskWidget(show);
+    if (!show || (mTemplatePicker->isVisible() && !mTextToolsPanel->colorPaletteIsShown()))
+        mTemplatePicker->showMessageMaskWidget(show);
 }
 
 void TitlerWindow::slotSystemLanguageChanged(SystemSetupDef::emSystemLanguageType systemLanguage)
 {
     switchTranslator(systemLanguage);
     useSpecifiedFont(systemLanguage);
+    mTemplatePicker->reloadTemplates(systemLanguage);
 }
 
 void TitlerWindow::slotInputLanguageChanged(SystemSetupDef::emInputLanguageType inputLanguage)
@@ -301,6 +307,7 @@ void TitlerWindow::slotGetModuleInfo(SystemSetupDef::emInformationModel moduleIn
     m_emModuleInfo = moduleInfo;
     mCanvasScene->setModuleInfo(moduleInfo);
     mTextToolsPanel->setModuleInfo(moduleInfo);
+    mTemplatePicker->setModuleInfo(moduleInfo);
 }
 
 void TitlerWindow::switchTranslator(SystemSetupDef::emSystemLanguageType type)
@@ -325,6 +332,7 @@ void TitlerWindow::retranslateUI()
     mTextToolsPanel->translateText();
     mToolsBar->translateText();
     mArchiveList->translateText();
+    mTemplatePicker->translateText();
 }
 
 void TitlerWindow::useSpecifiedFont(SystemSetupDef::emSystemLanguageType type)
@@ -333,6 +341,7 @@ void TitlerWindow::useSpecifiedFont(SystemSetupDef::emSystemLanguageType type)
         type == SystemSetupDef::emSystemLanguageChinese ? QStringLiteral("DFHeiW5-A") : QStringLiteral("KST");
     setStyleSheet(QStringLiteral(" * {font-family:'%1';}").arg(family));
     mArchiveList->setSystemLanFont(family);
+    mTemplatePicker->setSystemLanFont(QFont(family));
 }
 
 void TitlerWindow::changeFontComboxItem(SystemSetupDef::emInformationModel moduleInfo)
