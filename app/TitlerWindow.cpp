@@ -17,6 +17,7 @@
 #include "canvas/DrawBoundingRectangle.h"
 #include "canvas/GraphicsView.h"
 #include "library/ArchiveList.h"
+#include "library/TemplatePicker.h"
 #include "library/ThumbnailRender.h"
 #include "messaging/services/ISoftKeyBoardController.h"
 #include "panel/TextToolsPanel.h"
@@ -275,6 +276,7 @@ void TitlerWindow::initChildWindows()
     mOpacityMask->setGeometry(rect());
     mOpacityMask->raise();
     mOpacityMask->hide();
+    mTemplatePicker = new TemplatePicker(this);
 }
 
 void TitlerWindow::initProcessFactory()

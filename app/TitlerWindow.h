@@ -39,6 +39,7 @@ class ShowMessageController;
 class ShowTitlerController;
 class SystemSetupInfoController;
 class TextToolsPanel;
+class TemplatePicker;
 class TitlerAPPEventFilterController;
 class TitlerPowerController;
 class TitlerProjectDataController;
@@ -94,7 +95,10 @@ public slots:
     void showTitlerWindow(titler_paramter paramter);
     void refreshArchiveList(QString path);
     void showFolderDialog();
+    // Modal; return when the operator has chosen a template or cancelled. The second begins with the
+    // operator's own templates.
     void showTemplateDialog();
+    void showTemplateDialogOnUser();
 
     // Undo.
     void pushUndoStack(QUndoCommand* subUndoCommand); // takes over the command
@@ -167,6 +171,8 @@ private:
     void connectForTextToolsPanel();
     void connectForUndoRedoCommand();
     void connectForController();
+    void connectForTemplates();
+    void connectForTemplateNotices();
 
     bool ignoreMouseAndTouchEventWhenArchiveListIsMoveMode(QObject* obj, QEvent* event);
     bool ignoreTouchEventWhenSliderIsShowing(QObject* obj, QEvent* event) const;
@@ -175,6 +181,7 @@ private:
     void sendTransientControlEvent(bool on);
     void reportHiddenControl();
 
+    void setOpacityMaskVisible(bool visible);
     void showDialogMaskWidget(bool show);
     void showMessageMaskWidget(bool show);
     QWidget* createMask() const;
@@ -199,6 +206,7 @@ private:
     KSPushbutton* mMoveButton = nullptr;
     QUndoStack mUndoStack;
     QWidget* mOpacityMask = nullptr;
+    TemplatePicker* mTemplatePicker = nullptr;
     QWidget* mMessageMask = nullptr;
     QWidget* mDialogMask = nullptr;
     QTranslator* mTranslator = nullptr;

@@ -7,8 +7,8 @@
 #include "app/SystemSetupInfoController.h"
 #include "app/ToolsBar.h"
 #include "canvas/CanvasScene.h"
-#include "document/Archive.h"
 #include "library/ArchiveList.h"
+#include "library/TemplatePicker.h"
 #include "panel/TextToolsPanel.h"
 #include "touchui/KSInputContext.h"
 
@@ -42,6 +42,7 @@ void TitlerWindow::showTitlerWindow(titler_paramter paramter)
     mCanvasScene->setModuleInfo(m_emModuleInfo);
     mTextToolsPanel->setModuleInfo(m_emModuleInfo);
     mTextToolsPanel->initTextToolsPanel();
+    mTemplatePicker->setModuleInfo(m_emModuleInfo);
 
     mToolsBar->setFolderButtonEnabled(false); // there is no picker to open
     m_bEditByMain = paramter.mode == _titler_paramter::CREATE_OR_EDIT;
@@ -85,13 +86,6 @@ void TitlerWindow::showFolderDialog()
     mArchiveList->initArchiveList();
 }
 
-// An empty design stands for the operator's choice.
-void TitlerWindow::showTemplateDialog()
-{
-    Archive blank;
-    slotStartCreateNewArchiveFromTemplate(&blank);
-}
-
 void TitlerWindow::closeTitlerWindow()
 {
     mArchiveList->stopArchiveListTapAndHoldTimer();
@@ -132,6 +126,7 @@ void TitlerWindow::closeTitlerMainWindow()
     if (m_bRealClose) {
         close();
     } else {
+        mTemplatePicker->reject(); // an answered message may come while it is open
         hide();
         mCanvasScene->clearCanvas();
         mArchiveList->cleanArchiveList();
@@ -213,12 +208,6 @@ void TitlerWindow::clearUndoStack()
     mUndoStack.clear();
     if (ArchiveItem* item = mArchiveList->getCurrentOperationArchive())
         mArchiveList->clearOperationItemState(item);
-}
-
-void TitlerWindow::slotStartCreateNewArchiveFromTemplate(Archive* archiveData)
-{
-    mArchiveList->createArchiveFromTemplate(archiveData);
-    mCanvasScene->createThumnailPicture();
 }
 
 void TitlerWindow::slotStartPasteArchive()

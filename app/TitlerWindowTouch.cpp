@@ -6,6 +6,7 @@
 #include "canvas/CanvasScene.h"
 #include "canvas/GraphicsView.h"
 #include "library/ArchiveList.h"
+#include "library/TemplatePicker.h"
 #include "panel/TextToolsPanel.h"
 #include "support/SystemInfo.h"
 #include "touchui/KSPushbutton.h"
@@ -267,6 +268,8 @@ void TitlerWindow::showDialogMaskWidget(bool show)
     setAttribute(Qt::WA_AcceptTouchEvents, !show);
     if (!show || mTextToolsPanel->colorPaletteIsShown())
         mTextToolsPanel->showDialogMaskWidget(show);
+    if (!show || (mTemplatePicker->isVisible() && !mTextToolsPanel->colorPaletteIsShown()))
+        mTemplatePicker->showDialogMaskWidget(show);
 }
 
 void TitlerWindow::showMessageMaskWidget(bool show)
@@ -284,12 +287,15 @@ void TitlerWindow::showMessageMaskWidget(bool show)
     setAttribute(Qt::WA_AcceptTouchEvents, !show && !isDialogMasked);
     if (!show || mTextToolsPanel->colorPaletteIsShown())
         mTextToolsPanel->showMessageMaskWidget(show);
+    if (!show || (mTemplatePicker->isVisible() && !mTextToolsPanel->colorPaletteIsShown()))
+        mTemplatePicker->showMessageMaskWidget(show);
 }
 
 void TitlerWindow::slotSystemLanguageChanged(SystemSetupDef::emSystemLanguageType systemLanguage)
 {
     switchTranslator(systemLanguage);
     useSpecifiedFont(systemLanguage);
+    mTemplatePicker->reloadTemplates(systemLanguage);
 }
 
 void TitlerWindow::slotInputLanguageChanged(SystemSetupDef::emInputLanguageType inputLanguage)
@@ -303,6 +309,7 @@ void TitlerWindow::slotGetModuleInfo(SystemSetupDef::emInformationModel moduleIn
     m_emModuleInfo = moduleInfo;
     mCanvasScene->setModuleInfo(moduleInfo);
     mTextToolsPanel->setModuleInfo(moduleInfo);
+    mTemplatePicker->setModuleInfo(moduleInfo);
 }
 
 void TitlerWindow::switchTranslator(SystemSetupDef::emSystemLanguageType type)
@@ -327,6 +334,7 @@ void TitlerWindow::retranslateUI()
     mTextToolsPanel->translateText();
     mToolsBar->translateText();
     mArchiveList->translateText();
+    mTemplatePicker->translateText();
 }
 
 void TitlerWindow::useSpecifiedFont(SystemSetupDef::emSystemLanguageType type)
@@ -335,6 +343,7 @@ void TitlerWindow::useSpecifiedFont(SystemSetupDef::emSystemLanguageType type)
         type == SystemSetupDef::emSystemLanguageChinese ? QStringLiteral("DFHeiW5-A") : QStringLiteral("KST");
     setStyleSheet(QStringLiteral(" * {font-family:'%1';}").arg(family));
     mArchiveList->setSystemLanFont(family);
+    mTemplatePicker->setSystemLanFont(QFont(family));
 }
 
 void TitlerWindow::changeFontComboxItem(SystemSetupDef::emInformationModel moduleInfo)

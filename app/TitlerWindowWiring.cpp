@@ -24,6 +24,7 @@ void TitlerWindow::connectWidget()
     connectForTextToolsPanel();
     connect(mArchiveList, &ArchiveList::signalStartPasteArchive, this, &TitlerWindow::slotStartPasteArchive);
     connect(this, &TitlerWindow::moveButtonClicked, mArchiveList, &ArchiveList::moveButtonClicked);
+    connectForTemplates();
     connectForUndoRedoCommand();
 }
 
@@ -67,6 +68,8 @@ void TitlerWindow::connectForTextToolsAndArchiveList()
     connect(mArchiveList, &ArchiveList::itemSetDefaultState, mCanvasScene,
             &CanvasScene::slotMakeSceneThumnail);
     connect(mArchiveList, &ArchiveList::startTemplatePicker, this, &TitlerWindow::showTemplateDialog);
+    connect(mArchiveList, &ArchiveList::startUserTemplatePicker, this,
+            &TitlerWindow::showTemplateDialogOnUser);
     connect(mArchiveList, &ArchiveList::cleanUndoStack, this, &TitlerWindow::clearUndoStack);
     connect(mArchiveList, &ArchiveList::archiveListMenuShow, this,
             &TitlerWindow::hideSoftWareWithDeleteEmptyItems);
@@ -152,4 +155,5 @@ void TitlerWindow::connectForController()
             &TitlerWindow::slotShowDialogMaskWidget);
     connect(mShowMessageController, &ShowMessageController::signalsShowMessageMaskWidget, this,
             &TitlerWindow::slotShowMessageMaskWidget);
+    connectForTemplateNotices();
 }

@@ -36,6 +36,12 @@ LIST_ROW = 143
 LIST_MENU_ENTRIES = ["Create New", "Copy", "Paste", "Delete", "Save as Template"]
 LIST_MENU_TOP = 50
 LIST_MENU_ROW = 60
+# The template picker: the middle of its first template, the way to the next one, its columns and its buttons.
+TEMPLATE_POINT = (431, 324)
+TEMPLATE_STEP = (258, 153)
+TEMPLATE_COLUMNS = 4
+TEMPLATE_TABS = {"Preset": (356, 216), "User": (475, 216)}
+TEMPLATE_BUTTONS = {"Select": (1285, 907), "Cancel": (1514, 907), "Delete": (1491, 829)}
 PICTURES = {"_1920.png": (1920, 1080), "_960.png": (960, 540), "_240.png": (240, 135), "_240S.png": (240, 135)}
 
 
@@ -251,6 +257,29 @@ class TitlerTest(unittest.TestCase):
         self.display.wait_until_still()
         self.click(x, y + LIST_MENU_TOP + LIST_MENU_ENTRIES.index(entry) * LIST_MENU_ROW)
         self.display.wait_until_still()
+
+    def point_at_template(self, number, tab="Preset"):
+        """In the open template picker, turns to the tab and chooses a template of the first rows."""
+        self.click(*TEMPLATE_TABS[tab])
+        self.display.wait_until_still()
+        row, column = divmod(number, TEMPLATE_COLUMNS)
+        self.click(TEMPLATE_POINT[0] + column * TEMPLATE_STEP[0], TEMPLATE_POINT[1] + row * TEMPLATE_STEP[1])
+        self.display.wait_until_still()
+
+    def choose_template(self, number, tab="Preset"):
+        """Takes a template of the open picker, which closes it."""
+        self.point_at_template(number, tab)
+        self.click(*TEMPLATE_BUTTONS["Select"])
+        self.display.wait_until_still()
+
+    def create_in_list(self, row, template=0):
+        """Begins a new title after the one in this row."""
+        self.choose_in_list_menu(row, "Create New")
+        self.choose_template(template)
+
+    def preset_templates(self, language="en"):
+        """The preset templates in the order in which the picker shows them."""
+        return self.titles(os.path.join(self.base, "resources", "Templates", "templates_" + language))
 
     def wait_titles(self, folder, count, timeout=20):
         session.wait_until(lambda: len(self.titles(folder)) == count, timeout * SLOW, f"{count} titles in {folder}")

@@ -25,7 +25,7 @@ class CreateTitles(harness.TitlerTest):
         # The second is made above the first, so the folder's order is not the order of making.
         for row in (1, 0):
             count = len(self.titles(folder))
-            self.choose_in_list_menu(row, "Create New")
+            self.create_in_list(row, template=row)
             self.wait_titles(folder, count + 1)
         self.close_window()
 
@@ -40,10 +40,30 @@ class CreateTitles(harness.TitlerTest):
         self.assertEqual(result["paths"], names)
         self.assertEqual(result["count"], 2)
         self.assertEqual(result["size"], sum(self.packed_size(name) for name in names))
-        for path in new:
+        templates = self.preset_templates()
+        # The upper one was made last, from the first template.
+        for path, template in zip(new, templates):
             title = harness.Title(path)
-            self.assertTrue(os.path.exists(path))
+            self.assertEqual(title.texts(), template.texts())
             self.assert_pictures_have_their_sizes(title)
+
+    def test_a_cancelled_picker_makes_no_title(self):
+        folder = self.folder(FOLDER)
+        old = [title.path for title in self.titles(folder)]
+        self.open_title(self.titles(folder)[0])
+        before = self.display.grab()
+        self.choose_in_list_menu(0, "Create New")
+        self.point_at_template(3)
+        picker = self.display.grab()
+        self.assertNotEqual(picker, before)
+        # The rest of the window is out of reach meanwhile.
+        self.click_tool("Close")
+        self.display.wait_until_still()
+        self.assertTrue(self.window())
+        self.click(*harness.TEMPLATE_BUTTONS["Cancel"])
+        harness.session.wait_until(lambda: self.display.grab() != picker, 20 * harness.SLOW, "the picker to go")
+        self.close_window()
+        self.assertEqual([title.path for title in self.titles(folder)], old)
 
     def test_a_session_in_which_nothing_was_made_is_answered_too(self):
         folder = self.folder(FOLDER)
@@ -59,7 +79,7 @@ class CreateTitles(harness.TitlerTest):
         old = [title.path for title in self.titles(folder)]
         self.open_for_creation(folder)
         start = self.appliance.mark()
-        self.choose_in_list_menu(1, "Create New")
+        self.create_in_list(1)
         self.wait_titles(folder, 3)
         self.choose_in_list_menu(2, "Delete")
         self.wait_titles(folder, 2)
