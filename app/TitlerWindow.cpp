@@ -26,6 +26,7 @@
 #include <QAction>
 #include <QApplication>
 #include <QHBoxLayout>
+#include <QImageReader>
 #include <QLabel>
 #include <QPainter>
 #include <QPushButton>
@@ -309,8 +310,11 @@ void TitlerWindow::paintEvent(QPaintEvent* event)
 
 void TitlerWindow::drawCanvasSceneBG(QPainter& painter)
 {
-    static const QString CANVAS_BACKGROUND = QStringLiteral(":/PanelBG/Titler_Canvas");
-    painter.drawPixmap(STARTPOINT_OF_CANVASSCENE_BG, QPixmap(CANVAS_BACKGROUND));
+    if (mCanvasPixmap.isNull()) {
+        QImageReader reader(QStringLiteral(":/PanelBG/Titler_Canvas"));
+        mCanvasPixmap = QPixmap::fromImageReader(&reader);
+    }
+    painter.drawPixmap(STARTPOINT_OF_CANVASSCENE_BG, mCanvasPixmap);
 }
 
 void TitlerWindow::resizeEvent(QResizeEvent* event)

@@ -206,6 +206,7 @@ private:
 
     QPixmap mLeftPanelPixmap;
     QPixmap mWindowPanelPixmap;
+    QPixmap mCanvasPixmap;
 
     bool m_bDeferArchiveList;
     bool m_bRealClose = true;

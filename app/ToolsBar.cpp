@@ -7,7 +7,6 @@
 
 #include <QAction>
 #include <QHBoxLayout>
-#include <QIcon>
 #include <QLabel>
 #include <QMenu>
 #include <QMouseEvent>
@@ -68,12 +67,13 @@ ToolsBar::~ToolsBar() = default;
 ToolsBar::ToolButton ToolsBar::createButton(const QString& iconName, const QPoint& textPoint)
 {
     ToolButton tool;
-    tool.iconName = iconName;
+    tool.icon = QIcon(QStringLiteral(":/Icon_") + iconName);
+    tool.disabledIcon = QIcon(QStringLiteral(":/Icon_Disabled_") + iconName);
     tool.button = new KSPushbutton(QString::fromLatin1(BUTTON_IMAGES), this);
     tool.button->setObjectName(iconName);
     tool.button->setFixedSize(TOOLBARBTN_SIZE);
     tool.button->setIconSize(BAR_ICON_SIZE);
-    tool.button->setIcon(QIcon(QStringLiteral(":/Icon_") + iconName));
+    tool.button->setIcon(tool.icon);
     tool.label = new QLabel(tool.button);
     tool.label->setAttribute(Qt::WA_TransparentForMouseEvents);
     tool.label->setAlignment(Qt::AlignCenter);
@@ -258,8 +258,7 @@ void ToolsBar::resetSafeArea()
 
 void ToolsBar::setToolEnabled(const ToolButton& tool, bool enabled)
 {
-    tool.button->setIcon(
-        QIcon((enabled ? QStringLiteral(":/Icon_") : QStringLiteral(":/Icon_Disabled_")) + tool.iconName));
+    tool.button->setIcon(enabled ? tool.icon : tool.disabledIcon);
     tool.label->setStyleSheet(QString::fromLatin1(enabled ? LABEL_STYLE : LABEL_DISABLED_STYLE));
     if (enabled) {
         tool.button->setEnabled(true);

@@ -1,6 +1,7 @@
 #pragma once
 
 #include <QColor>
+#include <QIcon>
 #include <QPixmap>
 #include <QPoint>
 #include <QPointer>
@@ -100,7 +101,9 @@ private:
     struct ToolButton {
         KSPushbutton* button = nullptr;
         QLabel* label = nullptr;
-        QString iconName; // resource name behind ":/Icon_"
+        // Kept: each icon that is made anew leaves its renderings in the application's cache.
+        QIcon icon;
+        QIcon disabledIcon;
     };
 
     ToolButton createButton(const QString& iconName, const QPoint& textPoint);

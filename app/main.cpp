@@ -8,6 +8,7 @@
 #include "touchui/KSInputContext.h"
 
 #include <QApplication>
+#include <QPixmapCache>
 #include <QStringList>
 #include <chrono>
 #include <malloc.h>
@@ -32,9 +33,11 @@ void keepMemoryFlat()
 {
     constexpr int LARGE_BLOCK = 256 * 1024;
     constexpr int HEAPS = 2;
+    constexpr int SMALL_PICTURES = 1024; // kB; what is large is kept where it is shown
     mallopt(M_MMAP_THRESHOLD, LARGE_BLOCK);
     mallopt(M_TRIM_THRESHOLD, LARGE_BLOCK);
     mallopt(M_ARENA_MAX, HEAPS);
+    QPixmapCache::setCacheLimit(SMALL_PICTURES);
 }
 
 // What a process that was killed in the middle of a save left behind; the list looks after the title folders.

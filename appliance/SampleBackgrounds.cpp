@@ -127,11 +127,6 @@ QImage SampleBackgrounds::lowerThird()
     return image;
 }
 
-QImage SampleBackgrounds::empty()
-{
-    return transparentPicture();
-}
-
 QImage SampleBackgrounds::checker(const QSize& size)
 {
     QImage image(size, QImage::Format_RGB32);

@@ -1,4 +1,4 @@
-// Background pictures of the sample titles and templates, painted at 1920x1080. The same every time.
+// Background pictures of the sample titles, painted at 1920x1080. The same every time.
 #pragma once
 
 #include <QImage>
@@ -12,8 +12,6 @@ public:
     static QImage stageLights();
     // A bar along the bottom, transparent elsewhere.
     static QImage lowerThird();
-    // Transparent everywhere.
-    static QImage empty();
 
     // Two shades of grey in squares, which stand for transparent parts.
     static QImage checker(const QSize& size);

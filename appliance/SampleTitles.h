@@ -1,9 +1,12 @@
-// The records of the sample titles and of the preset templates.
+// The records of the sample titles.
 #pragma once
 
+#include "appliance/SampleText.h"
 #include "document/Archive.h"
 
 #include <QImage>
+#include <QSize>
+#include <functional>
 #include <string>
 #include <vector>
 
@@ -14,7 +17,7 @@ public:
     // else.
     struct Sample {
         std::string stem;
-        QImage (*background)(); // null for a title without a background
+        std::function<QImage(const QSize&)> background; // paints it at a size; none without a background
         Archive archive;
     };
 
@@ -24,8 +27,15 @@ public:
         std::vector<Sample> samples;
     };
 
+    // A text object of a title.
+    struct Line {
+        const char* text; // UTF-8
+        SampleText::Look look;
+    };
+
     static std::vector<Folder> folders();
 
-    // English or Chinese preset templates.
-    static std::vector<Sample> templates(bool chinese);
+    // A title with the lines as text objects, numbered from 1.
+    static Sample sample(const char* stem, std::function<QImage(const QSize&)> background,
+                         const std::vector<Line>& lines);
 };

@@ -1,5 +1,6 @@
 #include "appliance/TitlerProvision.h"
 
+#include "appliance/PresetTemplates.h"
 #include "appliance/SampleBackgrounds.h"
 #include "document/ArchiveOrder.h"
 #include "document/TitleParser.h"
@@ -134,7 +135,7 @@ bool TitlerProvision::writeTemplateSet(ThumbnailRender& render, const QString& f
     }
     // The backgrounds of presets are named by absolute paths, so they lie where they stay from the start.
     const QString backgrounds = mBase + QLatin1String(TEMPLATES) + QStringLiteral("/backgrounds");
-    std::vector<SampleTitles::Sample> samples = SampleTitles::templates(chinese);
+    std::vector<SampleTitles::Sample> samples = PresetTemplates::samples(chinese);
     return makeFolder(backgrounds) && writeFolder(render, folder, samples, backgrounds);
 }
 
@@ -193,12 +194,13 @@ bool TitlerProvision::writeTitle(ThumbnailRender& render, const QString& folder,
     archive.setThumbnailMiddle(stem + "_960.png");
     archive.setThumbnailSmall(stem + "_240.png");
     archive.setThumbnailBlack(stem + "_240S.png");
-    if (sample.background != nullptr) {
+    if (sample.background) {
         // A title owns its background; templates share theirs and name it by its whole path.
         const bool own = backgroundFolder.isEmpty();
         const QString where = (own ? folder : backgroundFolder) + QLatin1Char('/');
         const QString name = QString::fromStdString(stem) + QStringLiteral("_source_%1.png");
-        if (!writeBackgrounds(sample.background(), where + name.arg(1280), where + name.arg(1920))) {
+        if (!writePicture(sample.background(QSize(1280, 720)), where + name.arg(1280)) ||
+            !writePicture(sample.background(QSize(1920, 1080)), where + name.arg(1920))) {
             return false;
         }
         const QString prefix = own ? QString() : where;
@@ -226,12 +228,6 @@ bool TitlerProvision::writeTitle(ThumbnailRender& render, const QString& folder,
         }
     }
     return true;
-}
-
-bool TitlerProvision::writeBackgrounds(const QImage& picture, const QString& small, const QString& big)
-{
-    return writePicture(picture.scaled(1280, 720, Qt::IgnoreAspectRatio, Qt::SmoothTransformation), small) &&
-           writePicture(picture, big);
 }
 
 bool TitlerProvision::writePicture(const QImage& picture, const QString& path)

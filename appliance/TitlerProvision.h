@@ -37,7 +37,6 @@ private:
                      std::vector<SampleTitles::Sample>& samples, const QString& backgroundFolder);
     bool writeTitle(ThumbnailRender& render, const QString& folder, SampleTitles::Sample& sample,
                     const QString& backgroundFolder);
-    bool writeBackgrounds(const QImage& picture, const QString& small, const QString& big);
     bool writePicture(const QImage& picture, const QString& path);
     bool makeFolder(const QString& path);
     bool moveIntoPlace(const QString& from, const QString& to);

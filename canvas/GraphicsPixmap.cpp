@@ -1,16 +1,22 @@
 #include "canvas/GraphicsPixmap.h"
 
 #include <QFileInfo>
+#include <QImageReader>
 #include <QPainter>
 
 namespace
 {
 
-// Opening a pipe waits until somebody writes to it, and a device may never end.
+// Opening a pipe waits until somebody writes to it, and a device may never end. Read past the application's
+// cache of pictures: a background is of no more use once its title is off the canvas, and four megabytes
+// large.
 QPixmap readPicture(const QString& path)
 {
     const QFileInfo info(path);
-    return info.exists() && !info.isFile() ? QPixmap() : QPixmap(path);
+    if (info.exists() && !info.isFile())
+        return {};
+    QImageReader reader(path);
+    return QPixmap::fromImageReader(&reader);
 }
 
 } // namespace

@@ -27,6 +27,8 @@ struct TextObjectConstants {
 
     static constexpr double DOCUMENT_MARGIN = 27.0;
     static constexpr double BIG_DOCUMENT_MARGIN = 40.5;
+    // Both margins beside a line together, as part of its height: room for the handles.
+    static constexpr double MARGIN_SHARE_OF_LINE = 0.6;
     static constexpr double HANDLEPIXMAPWIDTH = 24.0;
     static constexpr double HANDLEPIXMAPHEIGHT = 27.0;
 

@@ -17,8 +17,6 @@
 namespace
 {
 
-constexpr double MarginShareOfLine = 0.6;
-
 // Styles that the document lays out alike.
 bool sameLayout(const TextStyle& a, const TextStyle& b)
 {
@@ -146,19 +144,27 @@ void TextStyleEditor::documentChanged(int position, int removed, int added)
 
 int TextStyleEditor::cutOffCharsBeyondMaxNum(int position, int added)
 {
-    const QTextDocument& document = *m_item.document();
-    const int excess = documentLength(document) - (document.blockCount() - 1) - CHARACTER_LIMIT;
-    if (excess <= 0)
+    const QString text = m_item.toPlainText();
+    const qsizetype characters = text.size() - text.count(QLatin1Char('\n'));
+    if (characters <= CHARACTER_LIMIT)
+        return added;
+    // Only what has just come may go, from the cursor backwards.
+    QTextCursor cursor = m_item.textCursor();
+    const int end = cursor.position();
+    int begin = end;
+    for (qsizetype excess = characters - CHARACTER_LIMIT; excess > 0 && begin > position; --begin)
+        excess -= text.at(begin - 1) == QLatin1Char('\n') ? 0 : 1;
+    if (begin > position && text.at(begin).isLowSurrogate())
+        --begin;
+    if (begin == end)
         return added;
     const Guard guard(*this);
-    const int before = documentLength(document);
-    QTextCursor cursor = m_item.textCursor();
-    // Only what has just come may go.
-    while (documentLength(document) - (document.blockCount() - 1) > CHARACTER_LIMIT &&
-           cursor.position() > position)
-        cursor.deletePreviousChar();
+    cursor.setPosition(begin);
+    cursor.setPosition(end, QTextCursor::KeepAnchor);
+    cursor.removeSelectedText();
+    finishLayout();
     updateWidthAndAlign(m_lastWidth);
-    return std::max(added - (before - documentLength(document)), 0);
+    return std::max(added - (end - begin), 0);
 }
 
 void TextStyleEditor::replaceCharacters(int position, int removed, int added)
@@ -410,6 +416,7 @@ void TextStyleEditor::saveStyleForNextInsert(const TText& style, int undoFlag, i
 
 void TextStyleEditor::changeTextItemPosition(float x, float y)
 {
+    pushLastEditTextIntoStack();
     TText& current = m_styles.current();
     const QPointF old(current.getXValue(), current.getYValue());
     TouchTextEditor& touch = m_item.touchEditor();
@@ -550,7 +557,7 @@ void TextStyleEditor::adjustLeftAndRightMargin()
         if (block.layout()->lineCount() > 0)
             tallest = std::max(tallest, block.layout()->lineAt(0).height());
     }
-    BOUNDING_RECT_EXPAND_REGION = MarginShareOfLine * tallest;
+    BOUNDING_RECT_EXPAND_REGION = MARGIN_SHARE_OF_LINE * tallest;
     BOUNDING_RECT_EXPAND_REGION_FOR_HANDLE = BOUNDING_RECT_EXPAND_REGION / 2.0;
     const double margin = BOUNDING_RECT_EXPAND_REGION_FOR_HANDLE;
 

@@ -359,6 +359,7 @@ void TouchTextEditor::savePostionMoveUndoCommandWhenPositionChanged()
     if (!m_state.positionChanged)
         return;
     m_state.positionChanged = false;
+    m_item.pushLastEditTextIntoStack();
     TText& record = m_item.styles().current();
     const QPointF old(record.getXValue(), record.getYValue());
     const QPointF now = m_item.scenePos();
@@ -551,6 +552,8 @@ void TouchTextEditor::keyPress(QKeyEvent* event)
 void TouchTextEditor::keyboardClosed()
 {
     LOG_DEBUG_OPERATE(L"Edit Area", 200, L"*****SoftKeyBoardClosed event is received*****");
+    // No later step may come between what was typed and the end of it.
+    m_item.pushLastEditTextIntoStack();
     StyleDocument& styles = m_item.styles();
     if (!(styles.undoBaseline() == styles.current())) {
         TText before = styles.undoBaseline();

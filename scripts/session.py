@@ -115,17 +115,15 @@ class Display:
         os.makedirs(folder, exist_ok=True)
         self.folder = folder
         read_end, write_end = os.pipe()
-        self.server = Process(
-            ["Xvfb", "-displayfd", str(write_end), "-screen", "0", f"{WIDTH}x{HEIGHT}x24", "-nolisten", "tcp",
-             "-noreset", "-fbdir", folder],
-            os.path.join(folder, "xvfb.log"), pass_fds=[write_end])
+        self.server = Process(self.server_arguments(write_end), os.path.join(folder, "server.log"),
+                              pass_fds=[write_end])
         os.close(write_end)
         self.manager = None
         try:
             with os.fdopen(read_end) as stream:
                 number = stream.readline().strip()
             if not number:
-                raise SessionError(f"Xvfb did not start, see {self.server.log}")
+                raise SessionError(f"no display, see {self.server.log}")
             self.name = f":{number}"
             self.environment = dict(environment, DISPLAY=self.name)
             self.manager = Process(["openbox", "--sm-disable"], os.path.join(folder, "openbox.log"), self.environment)
@@ -133,6 +131,11 @@ class Display:
         except BaseException:
             self.stop()
             raise
+
+    def server_arguments(self, number_pipe):
+        """How the server is started; it writes the number of its display into the pipe."""
+        return ["Xvfb", "-displayfd", str(number_pipe), "-screen", "0", f"{WIDTH}x{HEIGHT}x24", "-nolisten", "tcp",
+                "-noreset", "-fbdir", self.folder]
 
     def _is_managed(self):
         self.manager.check()

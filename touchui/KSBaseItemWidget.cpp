@@ -10,7 +10,7 @@
 #include <QPixmap>
 #include <QPointerEvent>
 #include <QStyle>
-#include <QStyleOptionButton>
+#include <QStyleOption>
 #include <QVBoxLayout>
 
 namespace
@@ -286,9 +286,10 @@ void KSBaseItemWidget::paintEvent(QPaintEvent*)
     if (m_popup) {
         paintDragBase(painter);
     } else {
-        QStyleOptionButton option;
-        initStyleOption(&option);
-        style()->drawControl(QStyle::CE_PushButtonBevel, &option, &painter, this);
+        // The rule of the style sheet alone: as a button it would get the style's bevel, too.
+        QStyleOption option;
+        option.initFrom(this);
+        style()->drawPrimitive(QStyle::PE_Widget, &option, &painter, this);
     }
     paintDragFlag(painter);
 }

@@ -241,6 +241,10 @@ bool KSInputContext::forwardKeyPress(const QEvent* event)
     if (m_controller == nullptr || event->type() != QEvent::KeyPress) {
         return false;
     }
+    if (!m_controller->isReachable()) {
+        setClosed(true); // nobody would send the key back: the field takes it as it is
+        return false;
+    }
     const auto* key = static_cast<const QKeyEvent*>(event);
     tagSoftKeyBoardKeyData data;
     data.eventType = key->type();
@@ -284,7 +288,7 @@ bool KSInputContext::filterRequestSoftwareInputPanel()
 
 bool KSInputContext::showForFocusWidget(const tagSoftKeyBoardInitData& data)
 {
-    if (m_controller == nullptr) {
+    if (m_controller == nullptr || !m_controller->isReachable()) {
         return false;
     }
     if (m_bClosed) {

@@ -33,7 +33,7 @@ QWidget* KSMenu::s_parent = nullptr;
 KSMenu::KSMenu(QWidget* parent, const QFont& font)
     : QMenu(parent)
     , m_outsidePress(new OutsidePressFilter(this, this))
-    , m_frame(SliceFrame::family(QStringLiteral(":/Dialog/dialog_base_"), QStringLiteral("bottom")))
+    , m_frame(SliceFrame::family(QStringLiteral(":/Dialog/dialog_base_")))
     , m_arrow(QStringLiteral(":/Menu/context_menu_allow"))
     , m_separator(QStringLiteral(":/Menu/Separator_H"))
     , m_cursor(QStringLiteral(":/Menu/List_Cursor"))
@@ -372,39 +372,53 @@ void KSMenu::setCurrent(int row)
 // Without a compositor what is transparent would be black.
 void KSMenu::adjustMask()
 {
-    const MenuPlacement::Placement place = placement();
-    QRegion region(MenuPlacement::background(size(), place.side));
-    region += QRegion(getMenuPointPoints());
-    const QMargins corners = m_frame.corners();
-    if (!m_frame.isNull() && width() > corners.left() + corners.right()) {
-        QPixmap shape(size());
-        shape.fill(Qt::transparent);
-        QPainter painter(&shape);
-        m_frame.paint(painter, MenuPlacement::background(size(), place.side));
-        painter.end();
-        region = QRegion(shape.mask()) + QRegion(getMenuPointPoints());
+    QPixmap shape(size());
+    shape.fill(Qt::transparent);
+    QPainter painter(&shape);
+    drawBalloon(painter);
+    painter.end();
+    QRegion region(shape.mask());
+    if (region.isEmpty()) {
+        region = QRegion(getMenuBackgroundRect()) + QRegion(getMenuPointPoints());
     }
     setMask(region);
+}
+
+void KSMenu::drawBalloon(QPainter& painter) const
+{
+    const MenuPlacement::Placement place = placement();
+    m_frame.paint(painter, MenuPlacement::background(size(), place.side));
+    if (m_arrow.isNull()) {
+        return;
+    }
+    // The picture points up, and has a piece of the frame below its tip.
+    painter.save();
+    switch (place.side) {
+    case ArrowSide::Top:
+        painter.translate(place.tip.x(), 0);
+        break;
+    case ArrowSide::Right:
+        painter.translate(width(), place.tip.y());
+        painter.rotate(90);
+        break;
+    case ArrowSide::Bottom:
+        painter.translate(place.tip.x(), height());
+        painter.rotate(180);
+        break;
+    case ArrowSide::Left:
+        painter.translate(0, place.tip.y());
+        painter.rotate(270);
+        break;
+    }
+    painter.drawPixmap(-m_arrow.width() / 2, 0, m_arrow);
+    painter.restore();
 }
 
 void KSMenu::paintEvent(QPaintEvent*)
 {
     QPainter painter(this);
     painter.setRenderHint(QPainter::SmoothPixmapTransform);
-    const MenuPlacement::Placement place = placement();
-    m_frame.paint(painter, MenuPlacement::background(size(), place.side));
-    if (!m_arrow.isNull()) {
-        // The picture points up.
-        painter.save();
-        painter.translate(place.tip);
-        const int turn = place.side == ArrowSide::Top      ? 0
-                         : place.side == ArrowSide::Right  ? 90
-                         : place.side == ArrowSide::Bottom ? 180
-                                                           : 270;
-        painter.rotate(turn);
-        painter.drawPixmap(-m_arrow.width() / 2, 0, m_arrow);
-        painter.restore();
-    }
+    drawBalloon(painter);
     const QList<QAction*> list = rows();
     for (int row = 0; row < list.size(); ++row) {
         drawMenuItem(painter, row, list.at(row));

@@ -78,6 +78,7 @@ private:
     QList<QAction*> rows() const;
     void setCurrent(int row);
     void adjustMask();
+    void drawBalloon(QPainter& painter) const;
 
     OutsidePressFilter* m_outsidePress;
     QTimer* m_autoCloseTimer = nullptr;

@@ -39,8 +39,10 @@ void SliceFrame::paintPiece(QPainter& painter, NineSlice::Piece piece, const QRe
     if (picture.isNull() || target.isEmpty()) {
         return;
     }
+    // The edges are even along the way they are stretched: smoothing would only change their colours by a
+    // level and show the joints.
     const bool smooth = painter.testRenderHint(QPainter::SmoothPixmapTransform);
-    painter.setRenderHint(QPainter::SmoothPixmapTransform, picture.size() != target.size());
+    painter.setRenderHint(QPainter::SmoothPixmapTransform, piece == NineSlice::MiddleCenter);
     painter.drawPixmap(target, picture);
     painter.setRenderHint(QPainter::SmoothPixmapTransform, smooth);
 }

@@ -21,7 +21,7 @@ public:
     // The nine paths of a family: prefix + "Upper_Left" and so on; bottom is how its lower row is spelt.
     static QStringList family(const QString& prefix, const QString& bottom = QStringLiteral("Bottom"));
 
-    // The smoothly stretched pieces, in the painter's coordinates.
+    // In the painter's coordinates.
     void paint(QPainter& painter, const QRect& target) const;
     void paintPiece(QPainter& painter, NineSlice::Piece piece, const QRect& target) const;
 

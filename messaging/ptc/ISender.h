@@ -13,6 +13,8 @@ class ISender : public IObject
 public:
     // Sends and deletes the event; its data stays the caller's. Failures are not reported.
     virtual void send(Event* event) = 0;
+    // False when the peer is known to be gone, so that nothing that is sent can arrive.
+    virtual bool isConnected() const { return true; }
 };
 
 class IRemoteSender : public ISender

@@ -54,4 +54,9 @@ long Proxy::getRRIdentity()
     return m_adapterFactory->getRRIdentity();
 }
 
+bool Proxy::isConnected() const
+{
+    return m_sender != nullptr && m_sender->isConnected();
+}
+
 } // namespace PTC

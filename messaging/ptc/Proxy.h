@@ -24,6 +24,8 @@ public:
     virtual void destoryAdapter(long id);
     // The client number of this process.
     virtual long getRRIdentity();
+    // False when the process of the service is known to be gone.
+    bool isConnected() const;
 
 private:
     int m_id;

@@ -28,7 +28,7 @@ public:
     // connection was lost, is dropped. A peer that takes nothing for SEND_TIMEOUT_MS loses the connection.
     void send(PTC::Event* event) override;
     // Whether the connection stands and the peer has not closed it.
-    bool isConnected() const;
+    bool isConnected() const override;
 
     static constexpr int SEND_TIMEOUT_MS = 10000;
     void setSendTimeout(int milliseconds) { m_sendTimeoutMs = milliseconds; }

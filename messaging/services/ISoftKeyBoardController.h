@@ -23,4 +23,6 @@ public:
     virtual void registerCallBack(ISoftKeyBoardControllerCallBack* target) = 0;
     virtual void showMask() = 0;
     virtual void hideMask() = 0;
+    // False when the service is known to be gone: what is sent to it now is lost.
+    virtual bool isReachable() const { return true; }
 };

@@ -9,6 +9,7 @@ namespace MessageDef
 
 // Numbers of the messages that this program posts; their texts live in the message service.
 enum Message_ID : int {
+    MESSAGE_DELETE_TEMPLATE = 43,
     MESSAGE_RENAME_FAILED = 47,
     MESSAGE_FOLDER_EXISTS = 96,
     MESSAGE_FONT_MISSING = 109,

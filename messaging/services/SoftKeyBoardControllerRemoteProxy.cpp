@@ -59,3 +59,8 @@ void SoftKeyBoardControllerRemoteProxy::hideMask()
 {
     ServiceCall::invoke(*this, METHOD_hideMask);
 }
+
+bool SoftKeyBoardControllerRemoteProxy::isReachable() const
+{
+    return isConnected();
+}

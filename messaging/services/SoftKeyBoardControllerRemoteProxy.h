@@ -35,4 +35,5 @@ public:
     void registerCallBack(ISoftKeyBoardControllerCallBack* target) override;
     void showMask() override;
     void hideMask() override;
+    bool isReachable() const override;
 };

@@ -86,6 +86,7 @@ class TitlerTest(unittest.TestCase):
     # Characters to be typed that an ordinary keyboard has not.
     extra_keys = ""
     titler_arguments = ()
+    display_class = session.Display
     environment_changes = {}
 
     def setUp(self):
@@ -105,7 +106,7 @@ class TitlerTest(unittest.TestCase):
         self.programs = []
         self.copied = False
         self.base = self.provision()
-        self.display = session.Display(os.path.join(self.work, "x"), self.environment)
+        self.display = self.display_class(os.path.join(self.work, "x"), self.environment)
         self.addCleanup(self.display.stop)
         self.display.add_keys(self.extra_keys)
         self.environment = self.display.environment
@@ -329,4 +330,5 @@ class TitlerTest(unittest.TestCase):
 
 
 # The middle of each button of the tools bar, in pixels of the window.
-TOOL_POINTS = {"New Text": (810, 41), "Close": (1850, 41)}
+TOOL_POINTS = {"Folder": (664, 41), "New Text": (830, 41), "Delete": (996, 41), "Undo": (1163, 41), "Redo": (1328, 41),
+               "Safe Area": (1494, 41), "Canvas": (1660, 41), "Close": (1826, 41)}

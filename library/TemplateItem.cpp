@@ -1,0 +1,61 @@
+#include "library/TemplateItem.h"
+
+#include "library/TemplateThumbnail.h"
+#include "library/UserTemplateMenu.h"
+
+#include <QIcon>
+#include <QPixmap>
+
+TemplateItem::TemplateItem(int index, bool isUser, QWidget* parent)
+    : TouchEventButton(parent), mIndex(index), mIsUser(isUser)
+{
+    setFixedSize(WIDGET_WIDTH, WIDGET_HEIGHT);
+    setIconSize(TemplateThumbnail::SIZE);
+    setNormalStyle();
+    connect(this, &QAbstractButton::clicked, this, &TemplateItem::clickTriggered);
+}
+
+void TemplateItem::setImage(QString path)
+{
+    mImagePath = std::move(path);
+    mIsLoaded = false;
+    update();
+}
+
+void TemplateItem::setNormalStyle()
+{
+    mHasSelectedStyle = false;
+    setStyleSheet(QStringLiteral("QPushButton {border:0; background:url(:/checker) no-repeat center;}"));
+}
+
+void TemplateItem::setSelectedStyle()
+{
+    mHasSelectedStyle = true;
+    setStyleSheet(QStringLiteral("QPushButton { border: 4px solid rgb(0, 129, 255); "
+                                 "background:url(:/checker) no-repeat center;};"));
+}
+
+void TemplateItem::clickTriggered()
+{
+    setSelectedStyle();
+    emit itemSelected(mIndex, this);
+}
+
+void TemplateItem::showMenu()
+{
+    if (!mIsUser)
+        return;
+    if (!mMenu)
+        mMenu = new UserTemplateMenu(this);
+    mMenu->popup(mapToGlobal(rect().center()));
+}
+
+void TemplateItem::paintEvent(QPaintEvent* event)
+{
+    if (!mIsLoaded) {
+        mIsLoaded = true;
+        // The checker is the picture's own ground, so that it fills it whatever the size of the tile.
+        setIcon(QPixmap::fromImage(TemplateThumbnail::onChecker(TemplateThumbnail::read(mImagePath))));
+    }
+    TouchEventButton::paintEvent(event);
+}

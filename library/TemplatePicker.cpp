@@ -1,0 +1,228 @@
+// Building and painting of the dialog; see TemplatePickerActions.cpp for what is done with templates.
+#include "library/TemplatePicker.h"
+
+#include "canvas/DrawBoundingRectangle.h"
+#include "library/ArchiveItem.h"
+#include "library/TemplateScrollArea.h"
+#include "library/TemplateTab.h"
+#include "library/TitlerTabWidget.h"
+#include "touchui/KSPushbutton.h"
+
+#include <QFontMetrics>
+#include <QLabel>
+#include <QPainter>
+#include <QShowEvent>
+
+const QSize TemplatePicker::SCREEN_SIZE(SCREEN_WIDTH, SCREEN_HEIGHT);
+const QSize TemplatePicker::TAB_AREA_SIZE(TAB_AREA_WIDTH, TAB_AREA_HIGHT);
+const QSize TemplatePicker::SCROLL_AREA_SIZE(SCROLL_AREA_WIDTH, SCROLL_AREA_HIGHT);
+const QRect TemplatePicker::LINE_RECT(QPoint(12, 59), QPoint(1358, 62));
+const QRect TemplatePicker::BTMLINE_RECT(QPoint(12, 744), QPoint(1358, 747));
+const QPoint TemplatePicker::OUTSIDE_BORDER_STARTPOINT(0, 0);
+const QPoint TemplatePicker::INSIDE_BORDER_STARTPOINT(122, 160);
+const QSize TemplatePicker::TOOLBARBTN_SIZE(220, 40);
+
+namespace
+{
+
+const int DIALOG_FRAME = 7; // kind of frame
+const int TITLE_FONT_SIZE = 28;
+const int FONT_SIZE = 24;
+const int CAPTION_HEIGHT = 34;
+constexpr QRect MASK_AREA(10, 6, TemplatePicker::SCREEN_WIDTH - 19, TemplatePicker::SCREEN_HEIGHT - 18);
+
+// In the dialog.
+const int TABS_LEFT = (TemplatePicker::SCREEN_WIDTH - TemplatePicker::TAB_AREA_WIDTH) / 2;
+const int TABS_TOP = 62 + TemplatePicker::PARTS_SPACE;
+const int BUTTONS_TOP = (747 + TemplatePicker::SCREEN_HEIGHT - TemplatePicker::OUTER_MARGIN_HIGHT) / 2 - 20;
+
+// In the tab widget.
+const int PANE_LEFT = TemplatePicker::TAB_AREA_OUTTER_MARGIN_WIDTH;
+const int PANE_TOP = TemplatePicker::TABS_HIGHT + TemplatePicker::PAINS_SPACE;
+const int PANE_WIDTH = TemplatePicker::SCROLL_AREA_WIDTH + 2 * TemplatePicker::PAIN_LINE;
+const int PROPERTY_LEFT = PANE_LEFT + PANE_WIDTH + TemplatePicker::PAINS_SPACE;
+
+const char BUTTON_IMAGES[] =
+    "TextToolPanel_Buttons:Button_48_Rest_Left:Button_48_Rest_Center:Button_48_Rest_Right:"
+    "Button_48_Pressed_Left:Button_48_Pressed_Center:Button_48_Pressed_Right:"
+    "Button_48_Disabled_Left:Button_48_Disabled_Center:Button_48_Disabled_Right:"
+    "Button_48selected_Rest_Left:Button_48selected_Rest_Center:Button_48selected_Rest_Right:"
+    "Button_48selected_Pressed_Left:Button_48selected_Pressed_Center:Button_48selected_Pressed_Right:"
+    "Button_48selected_Disabled_Left:Button_48selected_Disabled_Center:Button_48selected_Disabled_Right";
+
+} // namespace
+
+TemplatePicker::TemplatePicker(QWidget* parent)
+    : QDialog(parent, Qt::Dialog | Qt::FramelessWindowHint)
+    , mReloadRule(SystemSetupDef::emSystemLanguageUnknown, false)
+    , mMasks(this, MASK_AREA)
+{
+    setObjectName(QStringLiteral("TemplateOverview"));
+    setStyleSheet(QStringLiteral(" QWidget#TemplateOverview { background:transparent; }"));
+    setAttribute(Qt::WA_TranslucentBackground);
+    setAttribute(Qt::WA_AcceptTouchEvents);
+    setFixedSize(SCREEN_SIZE);
+    mTitle = createLabel(this, QRect(TABS_LEFT, OUTER_MARGIN_HIGHT, TAB_AREA_WIDTH, LINE_RECT.top() - 9),
+                         "templatePickerTitle");
+    createTabs();
+    createPropertyArea();
+    createButtons();
+    setSystemLanFont(QFont(QStringLiteral("KST")));
+    translateText();
+    initImageView();
+    initImageView2();
+}
+
+TemplatePicker::~TemplatePicker()
+{
+    // The tabs look at the controllers.
+    delete mTabs;
+}
+
+void TemplatePicker::createTabs()
+{
+    mTabs = new TitlerTabWidget(this);
+    mTabs->setGeometry(QRect(QPoint(TABS_LEFT, TABS_TOP), TAB_AREA_SIZE));
+    mTabs->setPainLine(PANE_LEFT, PANE_TOP);
+    mPresetTab = new TemplateTab(mController, false);
+    mUserTab = new TemplateTab(mUserController, true);
+    for (TemplateTab* tab : {mPresetTab, mUserTab}) {
+        mTabs->addTab(tab, QString());
+        connect(tab, &TemplateTab::itemSelected, this, &TemplatePicker::triggerSelected);
+        connect(tab, &TemplateTab::itemPressed, this, &TemplatePicker::itemSelected);
+        connect(tab, &TemplateTab::selectionChanged, this, &TemplatePicker::updateButtons);
+    }
+    connect(mUserTab, &TemplateTab::selectionChanged, this, &TemplatePicker::updateUserTemplateArea);
+    connect(mTabs, &QTabWidget::currentChanged, this, &TemplatePicker::updateButtons);
+}
+
+QLabel* TemplatePicker::createLabel(QWidget* parent, const QRect& area, const char* name)
+{
+    auto* label = new QLabel(parent);
+    label->setObjectName(QLatin1String(name));
+    label->setTextFormat(Qt::PlainText);
+    label->setStyleSheet(QStringLiteral("background: transparent; color:rgb(220, 220, 220);"));
+    label->setGeometry(area);
+    return label;
+}
+
+// What stands beside the grid; all of it is placed when the tabs know where their pages are.
+void TemplatePicker::createPropertyArea()
+{
+    const QRect none;
+    mFileNameCaption = createLabel(mUserTab, none, "fileNameCaption");
+    mFileName = createLabel(mUserTab, none, "fileName");
+    mFileName->setStyleSheet(
+        QStringLiteral("background: rgb(38, 38, 38); color:rgb(178, 178, 178); padding: 0px 6px;"));
+    mTextCaption = createLabel(mUserTab, none, "textCaption");
+    mPreview = new ArchiveItem(&mPreviewArchive, ArchiveItem::NARROW_ITEM, mUserTab);
+    mPreview->initArchiveItemChildWidget();
+    mDeleteButton2 = createButton(mUserTab, QPoint(), "deleteTemplateButton");
+    connect(mDeleteButton2, &QPushButton::clicked, this, &TemplatePicker::deleteClicked2);
+}
+
+void TemplatePicker::createButtons()
+{
+    const int cancelLeft = TABS_LEFT + TAB_AREA_WIDTH - TOOLBARBTN_SIZE.width();
+    const QPoint selectPos(cancelLeft - PAINS_SPACE - TOOLBARBTN_SIZE.width(), BUTTONS_TOP);
+    mSelectButton = createButton(this, selectPos, "selectPresetButton");
+    mSelectButton2 = createButton(this, selectPos, "selectUserButton");
+    mCancelButton = createButton(this, QPoint(cancelLeft, BUTTONS_TOP), "cancelTemplateButton");
+    connect(mSelectButton, &QPushButton::clicked, this, &TemplatePicker::selectClicked);
+    connect(mSelectButton2, &QPushButton::clicked, this, &TemplatePicker::selectClicked2);
+    connect(mCancelButton, &QPushButton::clicked, this, &TemplatePicker::reject);
+}
+
+KSPushbutton* TemplatePicker::createButton(QWidget* parent, const QPoint& position, const char* name)
+{
+    auto* button = new KSPushbutton(QString::fromLatin1(BUTTON_IMAGES), parent);
+    button->setObjectName(QLatin1String(name));
+    button->setStyleSheet(QStringLiteral("color:rgb(220, 220, 220);"));
+    button->setGeometry(QRect(position, TOOLBARBTN_SIZE));
+    button->setAutoDefault(false);
+    connect(button, &QAbstractButton::pressed, this, [this, button] { buttonPressed(button); });
+    connect(button, &QAbstractButton::released, this, [this, button] { buttonReleased(button); });
+    return button;
+}
+
+void TemplatePicker::buttonPressed(KSPushbutton* button)
+{
+    button->changeButtonState(KSPushbutton::ButtonPressed);
+}
+
+void TemplatePicker::buttonReleased(KSPushbutton* button)
+{
+    button->changeButtonState(button->isEnabled() ? KSPushbutton::ButtonRest : KSPushbutton::ButtonDisabled);
+}
+
+void TemplatePicker::setSystemLanFont(QFont font)
+{
+    font.setPixelSize(TITLE_FONT_SIZE);
+    mTitle->setFont(font);
+    font.setPixelSize(FONT_SIZE);
+    for (QWidget* widget :
+         std::initializer_list<QWidget*>{mTabs, mFileNameCaption, mFileName, mTextCaption, mSelectButton,
+                                         mSelectButton2, mDeleteButton2, mCancelButton})
+        widget->setFont(font);
+    mPreview->updateRightChild();
+    updateUserTemplateArea();
+}
+
+void TemplatePicker::translateText()
+{
+    mTitle->setText(tr("Templates"));
+    mTabs->setTabText(0, tr("Preset"));
+    mTabs->setTabText(1, tr("User"));
+    mFileNameCaption->setText(tr("File Name"));
+    mTextCaption->setText(tr("Text"));
+    mSelectButton->setText(tr("Select"));
+    mSelectButton2->setText(tr("Select"));
+    mDeleteButton2->setText(tr("Delete"));
+    mCancelButton->setText(tr("Cancel"));
+}
+
+void TemplatePicker::showEvent(QShowEvent* event)
+{
+    QDialog::showEvent(event);
+    if (const QWidget* window = parentWidget())
+        move(window->mapToGlobal(window->rect().center()) - rect().center());
+    for (TemplateTab* tab : {mPresetTab, mUserTab})
+        tab->scrollArea()->move(tab->mapFrom(mTabs, QPoint(PANE_LEFT + PAIN_LINE, PANE_TOP + PAIN_LINE)));
+    const int width = PROPERTY_AREA_PARTS_WIDTH;
+    QPoint place = mUserTab->mapFrom(mTabs, QPoint(PROPERTY_LEFT, PANE_TOP));
+    for (QLabel* label : {mFileNameCaption, mFileName}) {
+        label->setGeometry(QRect(place, QSize(width, CAPTION_HEIGHT)));
+        place.ry() += CAPTION_HEIGHT + PARTS_SPACE;
+    }
+    mTextCaption->setGeometry(QRect(place, QSize(width, CAPTION_HEIGHT)));
+    mPreview->move(place + QPoint(0, CAPTION_HEIGHT + PARTS_SPACE));
+    const int bottom =
+        mPresetTab->mapFrom(mTabs, QPoint(0, PANE_TOP + SCROLL_AREA_HIGHT + 2 * PAIN_LINE)).y();
+    mDeleteButton2->move(place.x() + (width - TOOLBARBTN_SIZE.width()) / 2,
+                         bottom - TOOLBARBTN_SIZE.height());
+}
+
+void TemplatePicker::updateFilenameArea(const QString& name)
+{
+    const int room = mFileName->contentsRect().width() - 12;
+    const QFontMetrics metrics(mFileName->font());
+    mFileName->setText(metrics.horizontalAdvance(name) > room ? metrics.elidedText(name, Qt::ElideRight, room)
+                                                              : name);
+}
+
+void TemplatePicker::paintEvent(QPaintEvent* event)
+{
+    QDialog::paintEvent(event);
+    QPainter painter(this);
+    if (mFrame.isNull())
+        mFrame = DrawBoundingRectangle().paintBoundingRectangle(DIALOG_FRAME);
+    painter.drawPixmap(OUTSIDE_BORDER_STARTPOINT, mFrame);
+    drawHorizontalLine(painter);
+}
+
+void TemplatePicker::drawHorizontalLine(QPainter& painter)
+{
+    const QImage line(QStringLiteral(":/Separator_H"));
+    painter.drawImage(LINE_RECT, line);
+    painter.drawImage(BTMLINE_RECT, line);
+}

@@ -1,0 +1,157 @@
+// The dialog in which the operator picks what a new title starts from: a tab of the presets of the system
+// language, and a tab of the operator's own templates, of which the file name and the texts are shown and
+// which can be deleted there. It lives as long as the main window and is shown by exec(); closing keeps the
+// choice. GUI thread.
+#pragma once
+
+#include "document/Archive.h"
+#include "library/DialogMasks.h"
+#include "library/TemplateItem.h"
+#include "library/TemplatePickerController.h"
+#include "library/TemplateReloadRule.h"
+#include "library/UserTemplatePickerController.h"
+#include "messaging/services/MessageDefine.h"
+#include "messaging/services/SystemSetupDef.h"
+
+#include <QDialog>
+#include <QPixmap>
+#include <QPoint>
+#include <QPointer>
+#include <QRect>
+#include <QSize>
+#include <QString>
+
+class ArchiveItem;
+class KSPushbutton;
+class QLabel;
+class QPushButton;
+class TemplateTab;
+class TitlerTabWidget;
+
+class TemplatePicker : public QDialog
+{
+    Q_OBJECT
+
+public:
+    static const int SCREEN_WIDTH = 1371;
+    static const int SCREEN_HEIGHT = 833;
+    static const QSize SCREEN_SIZE;
+    static const int TAB_AREA_WIDTH = 1329;
+    static const int TAB_AREA_HIGHT = 669;
+    static const QSize TAB_AREA_SIZE;
+    static const int SCROLL_AREA_WIDTH = 1049;
+    static const int SCROLL_AREA_HIGHT = 595;
+    static const QSize SCROLL_AREA_SIZE;
+    static const int TABS_HIGHT = 52;
+    static const int PAINS_SPACE = 8;
+    static const int PARTS_SPACE = 6;
+    static const int PAIN_LINE = 2;
+    static const int OUTER_MARGIN_WIDTH = 10;
+    static const int OUTER_MARGIN_HIGHT = 9;
+    static const int PROPERTY_AREA_PARTS_WIDTH = 250;
+    static const int TAB_AREA_OUTTER_MARGIN_WIDTH = 11;
+    static const int GRID_SPACING = 10;
+    static const int MAX_COLUMN = 4;
+    static const QRect LINE_RECT;
+    static const QRect BTMLINE_RECT;
+    static const QPoint OUTSIDE_BORDER_STARTPOINT;
+    static const QPoint INSIDE_BORDER_STARTPOINT;
+    static const QSize TOOLBARBTN_SIZE;
+
+    explicit TemplatePicker(QWidget* parent = nullptr);
+    ~TemplatePicker() override;
+
+    // Reads the presets again where the language calls for it.
+    void reloadTemplates(SystemSetupDef::emSystemLanguageType language);
+    // Reads the operator's templates again.
+    void reloadTemplates2();
+    // Turns to the operator's templates and shows the last of them.
+    void showUserTemplateTab();
+    // Takes the record over.
+    TemplateItem* addNewTemplateToLast(Archive* archive);
+
+    // Whether a template was taken since this was last set.
+    bool isSelectedItem() const { return mSelectedItem; }
+    void setSelectedItem(bool selected) { mSelectedItem = selected; }
+
+    void setModuleInfo(SystemSetupDef::emInformationModel module) { mModule = module; }
+    void setSystemLanFont(QFont font);
+    void translateText();
+
+    void showDialogMaskWidget(bool show) { mMasks.showDialogMaskWidget(show); }
+    void showMessageMaskWidget(bool show) { mMasks.showMessageMaskWidget(show); }
+
+    TemplateTab* presetTab() const { return mPresetTab; }
+    TemplateTab* userTab() const { return mUserTab; }
+
+signals:
+    // The record stays the picker's and is valid during the call.
+    void selectedTemplate(Archive* archive);
+    // A question is about to be shown over the soft keyboard.
+    void signalCloseSoftwareKeyBoardForFileManager();
+
+public slots:
+    // What happened to template folders: saved by the list, or reported by the file manager. Names are those
+    // of folders; a full path of a folder serves as well.
+    void slotSaveAsTemplate(QString name);
+    void slotImportNewUserTemplate(QString name);
+    void slotRenameUserTemplate(QString oldName, QString newName, QString path);
+    void slotDeleteUserTemplate(QString path);
+
+    void selectClicked();
+    void selectClicked2();
+    void deleteClicked2();
+    void buttonPressed(KSPushbutton* button);
+    void buttonReleased(KSPushbutton* button);
+    void itemSelected(QPushButton* button);
+    void triggerSelected(int index, TemplateItem* item);
+    void slotDeleteCloseMessage(MessageDefine::tagCloseParam param);
+
+protected:
+    void paintEvent(QPaintEvent* event) override;
+    void showEvent(QShowEvent* event) override;
+
+private:
+    void createTabs();
+    void createPropertyArea();
+    void createButtons();
+    KSPushbutton* createButton(QWidget* parent, const QPoint& position, const char* name);
+    QLabel* createLabel(QWidget* parent, const QRect& area, const char* name);
+    void initImageView();
+    void initImageView2();
+    void take(TemplateTab& tab);
+    int deleteUserTemplate();
+    void overrideTemplate(int id);
+    int findTemplateIdFromName(const QString& name) const;
+    void updateButtons();
+    void updateUserTemplateArea();
+    void updateTextObjectArea(const Archive& archive);
+    void updateFilenameArea(const QString& name);
+    void drawHorizontalLine(QPainter& painter);
+
+    TemplatePickerController mController;
+    UserTemplatePickerController mUserController;
+    TemplateReloadRule mReloadRule;
+    bool mPin = false; // the Chinese presets whatever the language
+    SystemSetupDef::emInformationModel mModule = SystemSetupDef::emInformationModelDefault;
+    bool mSelectedItem = false;
+    // The template that the operator has been asked about; an answer that comes when another is chosen is
+    // none.
+    QPointer<TemplateItem> mAskedItem;
+
+    TitlerTabWidget* mTabs = nullptr;
+    TemplateTab* mPresetTab = nullptr;
+    TemplateTab* mUserTab = nullptr;
+    QLabel* mTitle = nullptr;
+    QLabel* mFileNameCaption = nullptr;
+    QLabel* mFileName = nullptr;
+    QLabel* mTextCaption = nullptr;
+    ArchiveItem* mPreview = nullptr;
+    Archive mPreviewArchive;
+    KSPushbutton* mSelectButton = nullptr;
+    KSPushbutton* mSelectButton2 = nullptr;
+    KSPushbutton* mDeleteButton2 = nullptr;
+    KSPushbutton* mCancelButton = nullptr;
+    QPixmap mFrame;
+    DialogMasks mMasks;
+};

@@ -1,0 +1,234 @@
+// What the operator and the file manager do with templates.
+#include "canvas/MessageBoxController.h"
+#include "library/ArchiveItem.h"
+#include "library/TemplateItem.h"
+#include "library/TemplatePicker.h"
+#include "library/TemplateScrollArea.h"
+#include "library/TemplateTab.h"
+#include "library/TitlerTabWidget.h"
+#include "support/LogManager.h"
+#include "touchui/KSPushbutton.h"
+
+#include <QDir>
+#include <QFileInfo>
+#include <memory>
+#include <string>
+
+namespace
+{
+
+const int NOT_FOUND_NUMBER = 400;
+const int WARNING_PRIORITY = 4;
+
+// Name of the folder that holds the file of this path; of a path without a file it is the last part.
+QString folderNameOf(const QString& path)
+{
+    const QFileInfo info(path);
+    return info.fileName().endsWith(QLatin1String(".xml")) || path.endsWith(QLatin1Char('/'))
+               ? info.dir().dirName()
+               : info.fileName();
+}
+
+void logNotFound(const std::wstring& text)
+{
+    LOG_EVENT(L"TemplatePicker", NOT_FOUND_NUMBER, text, WARNING_PRIORITY);
+}
+
+} // namespace
+
+void TemplatePicker::initImageView()
+{
+    mPresetTab->setTemplates(mController.getTemplates(mReloadRule.language(), mPin));
+}
+
+void TemplatePicker::initImageView2()
+{
+    mUserTab->setTemplates(mUserController.getTemplates());
+}
+
+void TemplatePicker::reloadTemplates(SystemSetupDef::emSystemLanguageType language)
+{
+    if (!mReloadRule.needsReload(language, mPin))
+        return;
+    mReloadRule.reloaded(language, mPin);
+    initImageView();
+}
+
+void TemplatePicker::reloadTemplates2()
+{
+    initImageView2();
+}
+
+void TemplatePicker::showUserTemplateTab()
+{
+    mTabs->setCurrentIndex(1);
+    mUserTab->scrollToEnd();
+}
+
+TemplateItem* TemplatePicker::addNewTemplateToLast(Archive* archive)
+{
+    return mUserTab->addNewTemplateToLast(archive);
+}
+
+void TemplatePicker::itemSelected(QPushButton* button)
+{
+    if (auto* item = qobject_cast<TemplateItem*>(button))
+        item->clickTriggered();
+}
+
+void TemplatePicker::triggerSelected(int index, TemplateItem* item)
+{
+    LOG_USER_OPERATE(L"Template Area", 200, L"Select the " + std::to_wstring(index) + L" thumnail");
+    (item->isUser() ? mUserTab : mPresetTab)->select(item);
+}
+
+void TemplatePicker::updateButtons()
+{
+    const bool isUserTab = mTabs->currentIndex() == 1;
+    mSelectButton->setVisible(!isUserTab);
+    mSelectButton2->setVisible(isUserTab);
+    mSelectButton->setEnabled(mPresetTab->selectedItem() != nullptr);
+    mSelectButton2->setEnabled(mUserTab->selectedItem() != nullptr);
+    mDeleteButton2->setEnabled(mUserTab->selectedItem() != nullptr);
+}
+
+void TemplatePicker::updateUserTemplateArea()
+{
+    const Archive* archive = mUserTab->selectedArchive();
+    updateTextObjectArea(archive ? *archive : Archive());
+    updateFilenameArea(archive ? TemplateTab::templateName(*archive) : QString());
+}
+
+void TemplatePicker::updateTextObjectArea(const Archive& archive)
+{
+    mPreviewArchive = archive;
+    mPreview->updateRightChild();
+}
+
+void TemplatePicker::selectClicked()
+{
+    take(*mPresetTab);
+}
+
+void TemplatePicker::selectClicked2()
+{
+    take(*mUserTab);
+}
+
+void TemplatePicker::take(TemplateTab& tab)
+{
+    Archive* archive = tab.selectedArchive();
+    if (!archive)
+        return;
+    mSelectedItem = true;
+    emit selectedTemplate(archive);
+    accept();
+}
+
+void TemplatePicker::deleteClicked2()
+{
+    emit signalCloseSoftwareKeyBoardForFileManager();
+    const Archive* archive = mUserTab->selectedArchive();
+    MessageBoxController* messages = MessageBoxController::getInstance();
+    if (!archive || !messages)
+        return;
+    mAskedItem = mUserTab->selectedItem();
+    connect(messages, &MessageBoxController::signalCloseMessage, this,
+            &TemplatePicker::slotDeleteCloseMessage, Qt::UniqueConnection);
+    messages->postMessage(MessageDef::MESSAGE_DELETE_TEMPLATE, TemplateTab::templateName(*archive));
+}
+
+void TemplatePicker::slotDeleteCloseMessage(MessageDefine::tagCloseParam param)
+{
+    if (param.messageId != MessageDef::MESSAGE_DELETE_TEMPLATE)
+        return;
+    if (MessageBoxController* messages = MessageBoxController::getInstance())
+        disconnect(messages, &MessageBoxController::signalCloseMessage, this,
+                   &TemplatePicker::slotDeleteCloseMessage);
+    const bool isAsked = mAskedItem && mAskedItem == mUserTab->selectedItem();
+    mAskedItem.clear();
+    if (param.closeType != MessageDefine::CLOSE_OK || !isAsked)
+        return;
+    const int id = deleteUserTemplate();
+    if (id != -1)
+        mUserTab->removeTemplate(id);
+}
+
+int TemplatePicker::deleteUserTemplate()
+{
+    const Archive* archive = mUserTab->selectedArchive();
+    if (!archive || mUserController.deleteTemplate(archive->getPath()) == 0)
+        return -1;
+    return mUserTab->selectedItem()->getIndex();
+}
+
+void TemplatePicker::overrideTemplate(int id)
+{
+    mUserTab->removeTemplate(id);
+}
+
+int TemplatePicker::findTemplateIdFromName(const QString& name) const
+{
+    return mUserTab->findTemplateIdFromName(name);
+}
+
+void TemplatePicker::slotSaveAsTemplate(QString name)
+{
+    auto archive = std::make_unique<Archive>();
+    mUserController.loadTemplate(name.toStdString(), archive.get());
+    mUserController.addNewTemplateToLastInOrderXml(name.toStdString());
+    addNewTemplateToLast(archive.release());
+}
+
+void TemplatePicker::slotImportNewUserTemplate(QString name)
+{
+    if (name.contains(QLatin1Char('/')))
+        name = folderNameOf(name);
+    const int id = findTemplateIdFromName(name);
+    if (id != -1)
+        overrideTemplate(id);
+    auto archive = std::make_unique<Archive>();
+    if (mUserController.createNewTemplateXml(name.toStdString(), archive.get()) == 0)
+        return; // no such folder: there is nothing to offer
+    mUserController.addNewTemplateToLastInOrderXml(name.toStdString());
+    addNewTemplateToLast(archive.release());
+}
+
+void TemplatePicker::slotRenameUserTemplate(QString oldName, QString newName, QString path)
+{
+    LOG_DEBUG_OPERATE(L"TemplatePicker", 200,
+                      L"slotRenameUserTemplate() " + oldName.toStdWString() + L" -> " +
+                          newName.toStdWString());
+    const int id = findTemplateIdFromName(oldName);
+    if (id == -1) {
+        logNotFound(L"slotRenameUserTemplate() \"" + oldName.toStdWString() +
+                    L"\" is not found. cannot rename to \"" + newName.toStdWString() + L"\".");
+        return;
+    }
+    Archive* archive = mUserTab->archive(id);
+    const QString folder = path.endsWith(QLatin1String(".xml")) || path.endsWith(QLatin1Char('/'))
+                               ? QFileInfo(path).path()
+                               : path;
+    archive->setName((newName + QStringLiteral("/Titler")).toStdString());
+    archive->setPath((folder + QStringLiteral("/Titler.xml")).toStdString());
+    TemplateItem* item = mUserTab->item(id);
+    item->setImage(archive->getFullPathOfThumbnailSmall());
+    if (item == mUserTab->selectedItem()) {
+        updateFilenameArea(newName);
+        mUserTab->saveSelection();
+    }
+    mUserController.renameInOrderXml(oldName.toStdString(), newName.toStdString());
+}
+
+void TemplatePicker::slotDeleteUserTemplate(QString path)
+{
+    const QString name = folderNameOf(path);
+    const int id = findTemplateIdFromName(name);
+    if (id == -1) {
+        logNotFound(L"slotDeleteUserTemplate() \"" + name.toStdWString() + L"(" + path.toStdWString() +
+                    L")\" is not found.");
+        return;
+    }
+    overrideTemplate(id);
+    mUserController.reCreateNewOrderXml();
+}

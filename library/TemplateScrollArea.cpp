@@ -1,0 +1,257 @@
+#include "library/TemplateScrollArea.h"
+
+#include "touchui/FlickMotion.h"
+#include "touchui/KSScrollBar.h"
+
+#include <QApplication>
+#include <QMouseEvent>
+#include <QPushButton>
+#include <QScrollBar>
+#include <QTimerEvent>
+#include <QTouchEvent>
+#include <QWheelEvent>
+#include <optional>
+
+const QSize TemplateScrollArea::TOUCH_RECT_SIZE(50, 50);
+
+namespace
+{
+
+constexpr FlickMotion::Rules RULES = FlickMotion::templateGrid();
+
+// Narrower than in other lists: four columns and the bar fill the area.
+const char SCROLL_BAR_STYLE[] =
+    "QScrollBar:vertical { margin: 0px; border: 0px; width: 27px; background-color: rgb(51, 51, 51) }"
+    "QScrollBar::up-arrow:vertical { height: 0px } QScrollBar::down-arrow:vertical { height: 0px }"
+    "QScrollBar::add-line:vertical { height: 0px } QScrollBar::sub-line:vertical { height: 0px }"
+    "QScrollBar::handle:vertical { min-height: 42px }";
+
+std::optional<QEventPoint> pointOf(const QTouchEvent& event, int id)
+{
+    for (const QEventPoint& point : event.points()) {
+        if (point.id() == id)
+            return point;
+    }
+    return std::nullopt;
+}
+
+bool isTouch(QEvent::Type type)
+{
+    return type == QEvent::TouchBegin || type == QEvent::TouchUpdate || type == QEvent::TouchEnd ||
+           type == QEvent::TouchCancel;
+}
+
+} // namespace
+
+TemplateScrollArea::TemplateScrollArea(QWidget* parent) : QScrollArea(parent)
+{
+    setFrameShape(QFrame::NoFrame);
+    setVerticalScrollBar(new KSScrollBar(Qt::Vertical));
+    verticalScrollBar()->setStyleSheet(QString::fromLatin1(SCROLL_BAR_STYLE));
+    setHorizontalScrollBarPolicy(Qt::ScrollBarAlwaysOff);
+    setFocusPolicy(Qt::NoFocus);
+}
+
+void TemplateScrollArea::initTouch()
+{
+    setAttribute(Qt::WA_AcceptTouchEvents);
+    viewport()->setAttribute(Qt::WA_AcceptTouchEvents);
+    viewport()->installEventFilter(this);
+    verticalScrollBar()->installEventFilter(this);
+}
+
+bool TemplateScrollArea::isFlickEnd() const
+{
+    return FlickMotion::isFlickEnd(RULES, mStartPoint, mEndPoint);
+}
+
+void TemplateScrollArea::stopFlick()
+{
+    if (mTimerId != 0)
+        killTimer(mTimerId);
+    mTimerId = 0;
+    mFlick = false;
+}
+
+void TemplateScrollArea::forgetTouch()
+{
+    mTouchId = -1;
+    mTouchedObject.clear();
+    mPressedButton.clear();
+}
+
+bool TemplateScrollArea::event(QEvent* event)
+{
+    if (event->type() == QEvent::Gesture)
+        return true;
+    if (isTouch(event->type()))
+        return handleTouch(this, static_cast<QTouchEvent*>(event));
+    return QScrollArea::event(event);
+}
+
+bool TemplateScrollArea::eventFilter(QObject* watched, QEvent* event)
+{
+    if (watched == verticalScrollBar()) {
+        if (event->type() != QEvent::Wheel)
+            return QScrollArea::eventFilter(watched, event);
+        wheelEvent(static_cast<QWheelEvent*>(event));
+        return true;
+    }
+    if (watched == viewport() || qobject_cast<QPushButton*>(watched)) {
+        if (event->type() == QEvent::Gesture)
+            return true;
+        if (isTouch(event->type()))
+            return handleTouch(watched, static_cast<QTouchEvent*>(event));
+    }
+    return QScrollArea::eventFilter(watched, event);
+}
+
+bool TemplateScrollArea::handleTouch(QObject* watched, QTouchEvent* event)
+{
+    if (event->type() == QEvent::TouchCancel) {
+        stopFlick();
+        forgetTouch();
+        return true;
+    }
+    if (event->type() == QEvent::TouchBegin) {
+        if (mTouchId != -1 && mTouchedObject)
+            return true;
+        mTouchedObject = watched;
+        mPressedButton.clear();
+    } else if (watched != mTouchedObject) {
+        return true;
+    }
+    const bool wasFlicking = mFlick;
+    const int id = mTouchId;
+    onTouchEvent(event);
+    if (!wasFlicking)
+        onTranslateTouchEventToMouse(watched, event, id);
+    if (mTouchId == -1)
+        forgetTouch();
+    return true;
+}
+
+void TemplateScrollArea::onTouchEvent(QTouchEvent* event)
+{
+    if (event->type() == QEvent::TouchBegin) {
+        if (event->points().isEmpty())
+            return;
+        const QEventPoint& point = event->points().constFirst();
+        mTouchId = point.id();
+        stopFlick();
+        mStartPoint = mEndPoint = mapFromGlobal(point.globalPosition()).toPoint();
+        mFirstMove = true;
+        return;
+    }
+    const auto point = pointOf(*event, mTouchId);
+    if (!point)
+        return;
+    const QPoint position = mapFromGlobal(point->globalPosition()).toPoint();
+    const bool isInside = rect().contains(position);
+    // With another finger down beside it, a finger's end is an update of the event.
+    if (event->type() == QEvent::TouchUpdate && point->state() != QEventPoint::State::Released) {
+        if (!isInside)
+            return;
+        if (mFirstMove)
+            mStartPoint = position;
+        mFirstMove = false;
+        setEndPoint(position);
+        return;
+    }
+    mTouchId = -1;
+    if (!isInside)
+        return;
+    setEndPoint(position);
+    if (isFlickEnd())
+        stopFlick();
+    else
+        mFlick = true;
+}
+
+// id: of the finger, before this event.
+void TemplateScrollArea::onTranslateTouchEventToMouse(QObject* watched, QTouchEvent* event, int id)
+{
+    if (event->type() == QEvent::TouchBegin) {
+        if (event->points().isEmpty())
+            return;
+        mPressPoint = event->points().constFirst().globalPosition().toPoint();
+        mMoved = false;
+        mPressedButton = qobject_cast<QPushButton*>(watched);
+        mValueAtStart = verticalScrollBar()->value();
+        sendPressToViewport(mPressPoint);
+        return;
+    }
+    const auto point = pointOf(*event, id);
+    if (!point)
+        return;
+    if (FlickMotion::isBeyondSlop(mPressPoint, point->globalPosition(), FlickMotion::TOUCH_SLOP))
+        mMoved = true;
+    if (mTouchId != -1)
+        return;
+    viewport()->releaseMouse();
+    if (mPressedButton && !mMoved)
+        emit itemPressed(mPressedButton);
+}
+
+void TemplateScrollArea::sendPressToViewport(const QPoint& global)
+{
+    QMouseEvent press(QEvent::MouseButtonPress, viewport()->mapFromGlobal(global), global, Qt::LeftButton,
+                      Qt::LeftButton, Qt::NoModifier);
+    QCoreApplication::sendEvent(viewport(), &press);
+}
+
+void TemplateScrollArea::setEndPoint(const QPoint& point)
+{
+    mEndPoint = point;
+    if (!isFlickEnd() && mTimerId == 0) {
+        mValueAtStart = verticalScrollBar()->value();
+        mTimerId = startTimer(TOUCH_TIMER_TIME);
+    }
+}
+
+void TemplateScrollArea::timerEvent(QTimerEvent* event)
+{
+    if (event->timerId() != mTimerId) {
+        QScrollArea::timerEvent(event);
+        return;
+    }
+    if (isFlickEnd())
+        stopFlick();
+    else
+        getDistance();
+    const QScrollBar* bar = verticalScrollBar();
+    if (FlickMotion::isAtLimit(bar->value(), bar->minimum(), bar->maximum()))
+        stopFlick();
+}
+
+// One step of the start point towards the end point, and of the content by half of what lay between.
+void TemplateScrollArea::getDistance()
+{
+    const FlickMotion::Step step = mFlick ? FlickMotion::flickStep(RULES, mStartPoint, mEndPoint)
+                                          : FlickMotion::dragStep(RULES, mStartPoint, mEndPoint);
+    mStartPoint = step.start.toPoint();
+    changeScrollBarValue(step.scroll);
+}
+
+void TemplateScrollArea::changeScrollBarValue(int distance)
+{
+    QScrollBar* bar = verticalScrollBar();
+    bar->setValue(FlickMotion::scrolledValue(bar->value(), distance, bar->minimum(), bar->maximum()));
+}
+
+// The area and its bar hand wheel events on to each other.
+void TemplateScrollArea::wheelEvent(QWheelEvent* event)
+{
+    stopFlick();
+    QScrollBar* bar = verticalScrollBar();
+    const int way = event->angleDelta().y() * bar->singleStep() * QApplication::wheelScrollLines();
+    changeScrollBarValue(way / QWheelEvent::DefaultDeltasPerStep);
+    event->accept();
+}
+
+void TemplateScrollArea::hideEvent(QHideEvent* event)
+{
+    stopFlick();
+    forgetTouch();
+    QScrollArea::hideEvent(event);
+}

@@ -1,0 +1,64 @@
+// A grid that one finger scrolls and taps. The motion runs on after the finger has left and dies at either
+// end; a finger that comes down while it runs stops it and taps nothing. Further fingers change nothing.
+//
+// It filters the touches of itself, its viewport and the buttons in it, on which the owner installs it as
+// event filter. GUI thread.
+#pragma once
+
+#include <QPoint>
+#include <QPointer>
+#include <QScrollArea>
+
+class QPushButton;
+class QTouchEvent;
+
+class TemplateScrollArea : public QScrollArea
+{
+    Q_OBJECT
+
+public:
+    static const int TOUCH_TIMER_TIME = 33;   // ms
+    static const int DOUBLE_TOUCH_TIME = 500; // ms
+    static const QSize TOUCH_RECT_SIZE;
+
+    explicit TemplateScrollArea(QWidget* parent = nullptr);
+
+    // Lets touches in. Called once the area has its viewport and scroll bar.
+    void initTouch();
+    void stopFlick();
+    // Whether the finger and the point that follows it are as near as they get.
+    bool isFlickEnd() const;
+
+signals:
+    // A tap on a button; not after a drag.
+    void itemPressed(QPushButton* button);
+
+protected:
+    bool eventFilter(QObject* watched, QEvent* event) override;
+    bool event(QEvent* event) override;
+    void timerEvent(QTimerEvent* event) override;
+    void wheelEvent(QWheelEvent* event) override;
+    void hideEvent(QHideEvent* event) override;
+
+private:
+    bool handleTouch(QObject* watched, QTouchEvent* event);
+    void onTouchEvent(QTouchEvent* event);
+    void onTranslateTouchEventToMouse(QObject* watched, QTouchEvent* event, int id);
+    void setEndPoint(const QPoint& point);
+    void getDistance();
+    void changeScrollBarValue(int distance);
+    void forgetTouch();
+    void sendPressToViewport(const QPoint& global);
+
+    QPoint mStartPoint; // in this widget, like the end point
+    QPoint mEndPoint;
+    QPointer<QObject> mTouchedObject; // gone in the middle of a touch: its end will not come
+    int mTimerId = 0;
+    bool mFlick = false;
+    bool mFirstMove = false;
+    int mValueAtStart = 0;
+    QPoint mPressPoint; // global
+    bool mMoved = false;
+    int mTouchId = -1;
+    QPointer<QPushButton> mPressedButton;
+};

@@ -1,0 +1,29 @@
+#include "library/TemplateThumbnail.h"
+
+#include <QFileInfo>
+#include <QImageReader>
+#include <QPainter>
+
+QImage TemplateThumbnail::read(const QString& path)
+{
+    if (!QFileInfo(path).isFile()) // a pipe would be waited for
+        return {};
+    QImageReader reader(path);
+    const QSize size = reader.size();
+    if (size.isEmpty() || qint64(size.width()) * size.height() > PIXEL_LIMIT)
+        return {};
+    if (size.width() > SIZE.width() || size.height() > SIZE.height())
+        reader.setScaledSize(size.scaled(SIZE, Qt::KeepAspectRatio).expandedTo(QSize(1, 1)));
+    return reader.read();
+}
+
+QImage TemplateThumbnail::onChecker(const QImage& picture)
+{
+    QImage result(SIZE, QImage::Format_RGB32);
+    QPainter painter(&result);
+    painter.fillRect(result.rect(), QColor(102, 102, 102));
+    painter.fillRect(result.rect(), QBrush(QPixmap(QStringLiteral(":/checker"))));
+    const QSize left = SIZE - picture.size();
+    painter.drawImage(left.width() / 2, left.height() / 2, picture);
+    return result;
+}

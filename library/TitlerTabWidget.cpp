@@ -1,0 +1,35 @@
+#include "library/TitlerTabWidget.h"
+
+#include "canvas/DrawBoundingRectangle.h"
+#include "touchui/KSTabBar.h"
+
+#include <QPainter>
+
+namespace
+{
+
+const int LIST_PANE = 8; // kind of frame
+const int TAB_OVERLAP = 4;
+constexpr QColor DIALOG_COLOR(51, 51, 51);
+
+} // namespace
+
+TitlerTabWidget::TitlerTabWidget(QWidget* parent) : KSTabWidget(parent)
+{
+}
+
+void TitlerTabWidget::setPainLine(int x, int y)
+{
+    mFrame = DrawBoundingRectangle().paintBoundingRectangle(LIST_PANE);
+    mFrameX = x;
+    mFrameY = y;
+    update();
+}
+
+void TitlerTabWidget::paintEvent(QPaintEvent* event)
+{
+    KSTabWidget::paintEvent(event);
+    QPainter painter(this);
+    painter.drawPixmap(mFrameX, mFrameY, mFrame);
+    painter.fillRect(0, 0, width(), tabBar()->height() - TAB_OVERLAP, DIALOG_COLOR);
+}

@@ -1,0 +1,22 @@
+// The option menu of a user template.
+#pragma once
+
+#include "library/ArchiveAction.h"
+#include "touchui/KSMenu.h"
+
+#include <QList>
+
+class UserTemplateMenu : public KSMenu
+{
+    Q_OBJECT
+
+public:
+    explicit UserTemplateMenu(QWidget* parent = nullptr);
+
+    // Sets the texts again after a change of language.
+    void translateText();
+    ArchiveAction* action(ArchiveAction::ARCHIVE_ACTION_TYPE type) const;
+
+private:
+    QList<ArchiveAction*> mActions; // owned by this menu as their parent
+};

@@ -1,0 +1,112 @@
+// Every property of a style change, with two values each that can be told apart, for tests.
+#pragma once
+
+#include "CanvasTestTools.h"
+
+#include <QString>
+
+namespace StyleProperties
+{
+
+inline bool isOverall(int id)
+{
+    return id == GraphicsText::PropertyShadow || id == GraphicsText::PropertyAlign ||
+           id == GraphicsText::PropertyPosition;
+}
+
+// Gives the style or the record the first or second value of the property.
+inline void set(int id, TText& source, int value)
+{
+    const bool second = value != 0;
+    switch (id) {
+    case GraphicsText::PropertyShadow:
+        source.setShadowStyle(second ? 2 : 1);
+        source.getTextShadow()->setShadowDirectionX(second ? -1 : 1);
+        source.getTextShadow()->setShadowDirectionY(1);
+        return;
+    case GraphicsText::PropertyAlign:
+        source.setTextAlign(second ? 0 : 1);
+        return;
+    case GraphicsText::PropertyPosition:
+        source.setXValue(second ? 222.0F : 333.0F);
+        source.setYValue(second ? 111.0F : 155.0F);
+        return;
+    default:
+        break;
+    }
+    for (TextStyle* style : source.textItems()) {
+        TEdge edge = style->textEdge();
+        switch (id) {
+        case GraphicsText::PropertyFamily:
+            style->setFontFamily(second ? "DFHeiW5-A" : "DejaVu Sans");
+            break;
+        case GraphicsText::PropertySize:
+            style->setFontSize(second ? 120 : 60);
+            break;
+        case GraphicsText::PropertyBold:
+            style->setFontBold(second ? 0 : 1);
+            break;
+        case GraphicsText::PropertyItalic:
+            style->setIsTextItalic(second ? 0 : 1);
+            break;
+        case GraphicsText::PropertyColor:
+            style->setFontColor(second ? "#00AA00" : "#AA0000");
+            break;
+        case GraphicsText::PropertyEdge:
+            style->setIsTextEdge(second ? 0 : 1);
+            break;
+        case GraphicsText::PropertyEdgeWidthPreview:
+            style->setIsTextEdge(1);
+            edge.setEdgeWidth(second ? 9 : 5);
+            style->setTextEdge(edge);
+            break;
+        case GraphicsText::PropertyEdgeWidthOrColor:
+            style->setIsTextEdge(1);
+            edge.setEdgeColor(second ? "#0000FF" : "#FF00FF");
+            style->setTextEdge(edge);
+            break;
+        case GraphicsText::PropertyKerning:
+            style->setTextKerning(second ? 80 : 150);
+            break;
+        default:
+            break;
+        }
+    }
+}
+
+// What a style holds, without the text, as one line that can be compared and read.
+inline QString describe(const TextStyle& style)
+{
+    return QString("%1 %2 %3 b%4 i%5 k%6 e%7 %8 %9")
+        .arg(QString::fromStdString(style.getFontFamily()))
+        .arg(style.getFontSize())
+        .arg(QString::fromStdString(style.getFontColor()))
+        .arg(style.isFontBold())
+        .arg(style.isTextItalic())
+        .arg(style.getTextKerning())
+        .arg(style.isTextEdge())
+        .arg(style.textEdge().getEdgeWidth())
+        .arg(QString::fromStdString(style.textEdge().getEdgeColor()));
+}
+
+// The whole record, with its place.
+inline QString describe(const TText& record)
+{
+    QString text = QString("id%1 (%2,%3,%4) align%5 shadow%6 %7,%8 %9\n")
+                       .arg(record.getTextObjectID())
+                       .arg(record.getXValue())
+                       .arg(record.getYValue())
+                       .arg(record.getZValue())
+                       .arg(record.getTextAlign())
+                       .arg(record.getShadowStyle())
+                       .arg(record.getTextShadow()->getShadowDirectionX())
+                       .arg(record.getTextShadow()->getShadowDirectionY())
+                       .arg(record.getTextShadow()->getShadowBlurRadius());
+    for (const TextStyle* style : record.textItems())
+        text += QString::fromStdString(style->getText()) + QLatin1Char('|') + describe(*style) +
+                QLatin1Char('|') + QString::fromStdString(style->getAlphaDefaultFontOfInputLanguage()) +
+                QLatin1Char('\n');
+    return text;
+}
+
+} // namespace StyleProperties

@@ -1,0 +1,114 @@
+// Template folders beside the title folders of LibraryFixture.
+#pragma once
+
+#include "LibraryFixture.h"
+
+#include "document/ArchiveManager.h"
+#include "document/TemplateManager.h"
+#include "document/UserTemplateManager.h"
+#include "support/FileSyncQueue.h"
+
+#include <QDateTime>
+
+class TemplateFixture : public LibraryFixture
+{
+public:
+    QString presetRoot() const { return base() + QStringLiteral("/templates"); }
+    QString userRoot() const { return base() + QStringLiteral("/usertemplates"); }
+    QString userTitle(const QString& name) const
+    {
+        return userRoot() + QLatin1Char('/') + name + QStringLiteral("/Titler.xml");
+    }
+
+    // Empties both and forgets what was read from them.
+    void resetTemplates()
+    {
+        FileSyncQueue::flush(std::chrono::seconds(30));
+        TemplateManager::cleanUp();
+        UserTemplateManager::cleanUp();
+        for (const QString& folder : {presetRoot(), userRoot()}) {
+            QDir(folder).removeRecursively();
+            QDir().mkpath(folder);
+        }
+        for (const char* set : {"/templates_en", "/templates_chs"})
+            QDir().mkpath(presetRoot() + QLatin1String(set));
+        mAge = 0;
+    }
+
+    // Presets with these stems, as the only ones of the set.
+    void makePresets(const QString& set, const QStringList& stems, bool hasBackground = false) const
+    {
+        const QString folder = presetRoot() + QLatin1Char('/') + set;
+        for (const QString& stem : stems) {
+            const auto archive = makeRecord(folder, stem, stem);
+            if (hasBackground) {
+                archive->setBgResource((folder + QStringLiteral("/bg_1280.png")).toStdString());
+                archive->setBgResourceBig((folder + QStringLiteral("/bg_1920.png")).toStdString());
+            }
+            ArchiveManager().saveArchive(archive.get());
+            picture(Qt::blue).save(folder + QLatin1Char('/') + stem + QStringLiteral("_240.png"));
+        }
+        if (hasBackground) {
+            for (const char* name : {"/bg_1280.png", "/bg_1920.png"})
+                picture(Qt::gray).save(folder + QLatin1String(name));
+        }
+        writeOrder(folder, stems);
+    }
+
+    // Younger than all made before. Takes its place at the next start of the manager.
+    void makeUserTemplate(const QString& name, const QStringList& texts = {QStringLiteral("text")})
+    {
+        const QString folder = userRoot() + QLatin1Char('/') + name;
+        QDir().mkpath(folder);
+        Archive archive;
+        archive.setPath(userTitle(name).toStdString());
+        archive.setThumbnailSmall("Titler_240.png");
+        archive.setBgResource("Titler_source_1280.png");
+        archive.setBgResourceBig("Titler_source_1920.png");
+        std::vector<TText*> records;
+        for (const QString& text : texts)
+            records.push_back(makeText(text, static_cast<int>(records.size()) + 1));
+        archive.setText(records);
+        ArchiveManager().saveArchive(&archive);
+        makeUserPictures(name);
+        QFile file(userTitle(name));
+        if (file.open(QIODevice::ReadWrite))
+            file.setFileTime(QDateTime::fromSecsSinceEpoch(1000 + ++mAge), QFile::FileModificationTime);
+    }
+
+    void makeUserTemplates(int count)
+    {
+        for (int i = 1; i <= count; ++i)
+            makeUserTemplate(QStringLiteral("UserTemplate_%1").arg(i, 3, 10, QLatin1Char('0')));
+    }
+
+    void makeUserPictures(const QString& name) const
+    {
+        const QString folder = userRoot() + QLatin1Char('/') + name;
+        QDir().mkpath(folder);
+        for (const char* file : {"/Titler_240.png", "/Titler_source_1280.png", "/Titler_source_1920.png"})
+            picture(Qt::green).save(folder + QLatin1String(file));
+    }
+
+    // Names in the order file of the user templates.
+    QStringList userOrder() const
+    {
+        ArchiveController controller;
+        QStringList names;
+        for (const ArchiveOrder* row : controller.getFileOrder(userRoot()))
+            names.append(QString::fromStdString(row->getArchivePath()).section(QLatin1Char('/'), 0, 0));
+        return names;
+    }
+
+private:
+    QString base() const { return QFileInfo(titleRoot()).path(); }
+
+    static QImage picture(Qt::GlobalColor color)
+    {
+        QImage image(240, 135, QImage::Format_ARGB32);
+        image.fill(color);
+        return image;
+    }
+
+    int mAge = 0;
+};

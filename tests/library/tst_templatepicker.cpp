@@ -1,0 +1,705 @@
+// The template picker under a finger, on folders.
+#include "TemplateFixture.h"
+
+#include "library/ArchiveItem.h"
+#include "library/TemplateItem.h"
+#include "library/TemplatePicker.h"
+#include "library/TemplateScrollArea.h"
+#include "library/TemplateTab.h"
+#include "library/TitlerTabWidget.h"
+#include "library/UserTemplateMenu.h"
+#include "touchui/KSPushbutton.h"
+
+#include <QLabel>
+#include <QScrollBar>
+#include <QSignalSpy>
+#include <QTabBar>
+#include <QTest>
+#include <sys/fsuid.h>
+#include <sys/stat.h>
+
+class TestTemplatePicker : public QObject
+{
+    Q_OBJECT
+
+private slots:
+    void initTestCase() { Q_INIT_RESOURCE(TitlerToolResource); }
+
+    void init()
+    {
+        mFixture.resetTemplates();
+        mReports.take();
+        mMessages.take();
+    }
+
+    void cleanup() { mPicker.reset(); }
+
+    void reloadRules_data()
+    {
+        using namespace SystemSetupDef;
+        QTest::addColumn<int>("language");
+        QTest::addColumn<bool>("pin");
+        QTest::addColumn<bool>("lastPin");
+        QTest::addColumn<bool>("reloads");
+        QTest::newRow("same, not pinned") << 1 << false << false << false;
+        QTest::newRow("same, no longer pinned") << 1 << false << true << false;
+        QTest::newRow("same, newly pinned") << 1 << true << false << true;
+        QTest::newRow("same, still pinned") << 1 << true << true << false;
+        QTest::newRow("other, not pinned") << 2 << false << false << true;
+        QTest::newRow("other, no longer pinned") << 2 << false << true << true;
+        QTest::newRow("other, newly pinned") << 2 << true << false << true;
+        QTest::newRow("other, still pinned") << 2 << true << true << false;
+    }
+
+    void reloadRules()
+    {
+        QFETCH(int, language);
+        QFETCH(bool, pin);
+        QFETCH(bool, lastPin);
+        QFETCH(bool, reloads);
+        TemplateReloadRule rule(SystemSetupDef::emSystemLanguageEnglish, lastPin);
+        const auto wanted = static_cast<SystemSetupDef::emSystemLanguageType>(language);
+        QCOMPARE(rule.needsReload(wanted, pin), reloads);
+        rule.reloaded(wanted, pin);
+        QCOMPARE(rule.language(), wanted);
+        QVERIFY(!rule.needsReload(wanted, pin));
+    }
+
+    void setsOfTheController()
+    {
+        mFixture.makePresets("templates_en", {"lower"});
+        mFixture.makePresets("templates_chs", {"xia", "zhong"});
+        TemplatePickerController controller;
+        const auto count = [&](int language, bool pin) {
+            const QVector<Archive*> templates =
+                controller.getTemplates(static_cast<SystemSetupDef::emSystemLanguageType>(language), pin);
+            qDeleteAll(templates);
+            return templates.size();
+        };
+        QCOMPARE(count(0, false), 1);
+        QCOMPARE(count(1, false), 1);
+        QCOMPARE(count(2, false), 2);
+        QCOMPARE(count(3, false), 1);
+        QCOMPARE(count(1, true), 2);
+    }
+
+    void presetsFollowTheLanguage()
+    {
+        mFixture.makePresets("templates_en", {"lower", "strap"});
+        mFixture.makePresets("templates_chs", {"xia"});
+        open();
+        QCOMPARE(names(presets()), QStringList({"lower", "strap"}));
+        mPicker->reloadTemplates(SystemSetupDef::emSystemLanguageEnglish);
+        QCOMPARE(names(presets()), QStringList({"lower", "strap"}));
+        tapItem(presets(), 1);
+        // The same language again reads nothing: the choice stays.
+        TemplateItem* chosen = presets()->selectedItem();
+        mPicker->reloadTemplates(SystemSetupDef::emSystemLanguageEnglish);
+        QCOMPARE(presets()->selectedItem(), chosen);
+        mPicker->reloadTemplates(SystemSetupDef::emSystemLanguageChinese);
+        QCOMPARE(names(presets()), QStringList({"xia"}));
+        QVERIFY(!presets()->selectedItem());
+        QVERIFY(!button("selectPresetButton")->isEnabled());
+        // Each set knows its last choice.
+        tapItem(presets(), 0);
+        mPicker->reloadTemplates(SystemSetupDef::emSystemLanguageEnglish);
+        QCOMPARE(presets()->selectedItem(), presets()->item(1));
+        QVERIFY(presets()->item(1)->hasSelectedStyle());
+        QVERIFY(button("selectPresetButton")->isEnabled());
+    }
+
+    void theModelOfTheApplianceChangesNoSet()
+    {
+        mFixture.makePresets("templates_en", {"lower"});
+        mFixture.makePresets("templates_chs", {"xia"});
+        open();
+        mPicker->setModuleInfo(SystemSetupDef::emInformationModelChina);
+        mPicker->reloadTemplates(SystemSetupDef::emSystemLanguageEnglish);
+        QCOMPARE(names(presets()), QStringList{"lower"});
+    }
+
+    void noTemplates()
+    {
+        open();
+        QCOMPARE(presets()->count(), 0);
+        QCOMPARE(users()->count(), 0);
+        QVERIFY(!button("selectPresetButton")->isEnabled());
+        QVERIFY(!button("selectUserButton")->isEnabled());
+        QVERIFY(!button("deleteTemplateButton")->isEnabled());
+        QSignalSpy selected(mPicker.get(), &TemplatePicker::selectedTemplate);
+        mPicker->selectClicked();
+        mPicker->selectClicked2();
+        mPicker->deleteClicked2();
+        QVERIFY(selected.isEmpty());
+        QVERIFY(mMessages.take().isEmpty());
+        QVERIFY(mPicker->isVisible());
+    }
+
+    void placesInTheGrid()
+    {
+        mFixture.makePresets("templates_en", {"a", "b", "c", "d", "e"});
+        open();
+        QCOMPARE(presets()->item(3)->pos(), QPoint(3 * 258, 0));
+        QCOMPARE(presets()->item(4)->pos(), QPoint(0, 153));
+        QCOMPARE(presets()->item(4)->size(), QSize(248, 143));
+        QCOMPARE(presets()->scrollArea()->size(), QSize(1049, 595));
+        // The fourth column is not under the scroll bar.
+        mFixture.makeUserTemplates(13);
+        UserTemplateManager::cleanUp();
+        mPicker->reloadTemplates2();
+        mPicker->showUserTemplateTab();
+        QTRY_VERIFY(users()->scrollArea()->verticalScrollBar()->isVisible());
+        QVERIFY(users()->scrollArea()->viewport()->width() >= 4 * 248 + 3 * 10);
+    }
+
+    void aTapChoosesAndSelectTakes()
+    {
+        mFixture.makePresets("templates_en", {"a", "b", "c"}, true);
+        open();
+        QVERIFY(!button("selectPresetButton")->isEnabled());
+        QVERIFY(!button("selectUserButton")->isVisible());
+        tapItem(presets(), 0);
+        tapItem(presets(), 2);
+        QVERIFY(!presets()->item(0)->hasSelectedStyle());
+        QVERIFY(presets()->item(2)->hasSelectedStyle());
+        QVERIFY(button("selectPresetButton")->isEnabled());
+
+        mPicker->setSelectedItem(false);
+        QStringList taken;
+        connect(mPicker.get(), &TemplatePicker::selectedTemplate, this, [&](Archive* archive) {
+            QVERIFY(mPicker->isSelectedItem());
+            taken.append(QString::fromStdString(archive->getName()));
+            QVERIFY(archive->isPreset());
+        });
+        tap(button("selectPresetButton"));
+        QCOMPARE(taken, QStringList{"c"});
+        QTRY_VERIFY(!mPicker->isVisible());
+        QCOMPARE(mPicker->result(), int(QDialog::Accepted));
+
+        // The choice is kept by the open program and by the next one.
+        QCOMPARE(presets()->selectedItem(), presets()->item(2));
+        TemplateManager::cleanUp();
+        open();
+        QCOMPARE(presets()->selectedItem(), presets()->item(2));
+        QVERIFY(button("selectPresetButton")->isEnabled());
+    }
+
+    void theMouseServesAsWell()
+    {
+        mFixture.makePresets("templates_en", {"a", "b"});
+        open();
+        QTest::mouseClick(presets()->item(1), Qt::LeftButton);
+        QCOMPARE(presets()->selectedItem(), presets()->item(1));
+        QSignalSpy selected(mPicker.get(), &TemplatePicker::selectedTemplate);
+        QTest::mouseClick(button("selectPresetButton"), Qt::LeftButton);
+        QCOMPARE(selected.size(), 1);
+        QVERIFY(!mPicker->isVisible());
+    }
+
+    void cancelTakesNothing()
+    {
+        mFixture.makePresets("templates_en", {"a"});
+        open();
+        tapItem(presets(), 0);
+        QSignalSpy selected(mPicker.get(), &TemplatePicker::selectedTemplate);
+        tap(button("cancelTemplateButton"));
+        QTRY_VERIFY(!mPicker->isVisible());
+        QVERIFY(selected.isEmpty());
+        QVERIFY(!mPicker->isSelectedItem());
+        QCOMPARE(presets()->selectedItem(), presets()->item(0));
+    }
+
+    void aLastChoiceThatIsGone()
+    {
+        mFixture.makePresets("templates_en", {"a", "b"});
+        open();
+        tapItem(presets(), 1);
+        mPicker.reset();
+        QVERIFY(QFile::remove(mFixture.presetRoot() + "/templates_en/b.xml"));
+        TemplateManager::cleanUp();
+        open();
+        QCOMPARE(names(presets()), QStringList{"a"});
+        QVERIFY(!presets()->selectedItem());
+        QVERIFY(!button("selectPresetButton")->isEnabled());
+        TemplatePickerController controller;
+        QVERIFY(controller.getLastSelectedTemplate().empty());
+    }
+
+    void userTabShowsNameAndTexts()
+    {
+        mFixture.makeUserTemplate("first", {"one text"});
+        mFixture.makeUserTemplate("a name that is much too long for the place where it has to stand",
+                                  {"Breaking", "快讯", "third"});
+        open();
+        tapTab(1);
+        QVERIFY(button("selectUserButton")->isVisible());
+        QVERIFY(!button("selectPresetButton")->isVisible());
+        QCOMPARE(fileName()->text(), QString());
+        tapItem(users(), 0);
+        QCOMPARE(fileName()->text(), QString("first"));
+        QCOMPARE(preview()->textLines().first(), QString("one text"));
+        QVERIFY(button("deleteTemplateButton")->isEnabled());
+        tapItem(users(), 1);
+        QVERIFY(fileName()->text().startsWith("a name that"));
+        QVERIFY(fileName()->text().endsWith(QChar(0x2026)));
+        QVERIFY(QFontMetrics(fileName()->font()).horizontalAdvance(fileName()->text()) <=
+                fileName()->width());
+        QCOMPARE(preview()->textLines().mid(0, 3), QStringList({"Breaking", "快讯", "third"}));
+
+        QSignalSpy selected(mPicker.get(), &TemplatePicker::selectedTemplate);
+        tap(button("selectUserButton"));
+        QCOMPARE(selected.size(), 1);
+        QCOMPARE(selected[0][0].value<Archive*>(), users()->archive(1));
+    }
+
+    void deleteAsksAndDeletes()
+    {
+        mFixture.makeUserTemplates(5);
+        openUserTab();
+        tapItem(users(), 2);
+        QSignalSpy closeKeyboard(mPicker.get(), &TemplatePicker::signalCloseSoftwareKeyBoardForFileManager);
+        tap(button("deleteTemplateButton"));
+        QCOMPARE(closeKeyboard.size(), 1);
+        QCOMPARE(mMessages.take(), (Reports{{43, "UserTemplate_003"}}));
+        answer(MessageDefine::CLOSE_CANCEL);
+        QCOMPARE(users()->count(), 5);
+        answer(MessageDefine::CLOSE_OK); // to nobody's question
+        QCOMPARE(users()->count(), 5);
+
+        tap(button("deleteTemplateButton"));
+        tap(button("deleteTemplateButton"));
+        QCOMPARE(mMessages.take().size(), 2);
+        answer(MessageDefine::CLOSE_OK, 117); // another box
+        QCOMPARE(users()->count(), 5);
+        answer(MessageDefine::CLOSE_OK);
+        QCOMPARE(names(users()), QStringList({"UserTemplate_001", "UserTemplate_002", "UserTemplate_004",
+                                              "UserTemplate_005"}));
+        verifyDense();
+        QVERIFY(!QFile::exists(mFixture.userRoot() + "/UserTemplate_003"));
+        QCOMPARE(mFixture.userOrder(), names(users()));
+        QCOMPARE(mReports.take(), (Reports{{5, "Titler"}}));
+        QVERIFY(!users()->selectedItem());
+        QVERIFY(!button("selectUserButton")->isEnabled());
+        QVERIFY(!button("deleteTemplateButton")->isEnabled());
+        QCOMPARE(fileName()->text(), QString());
+        QCOMPARE(preview()->textLines().first(), QString());
+        answer(MessageDefine::CLOSE_OK);
+        QCOMPARE(users()->count(), 4);
+    }
+
+    void anAnswerAfterAnotherChoice()
+    {
+        mFixture.makeUserTemplates(3);
+        openUserTab();
+        tapItem(users(), 0);
+        tap(button("deleteTemplateButton"));
+        tapItem(users(), 1);
+        answer(MessageDefine::CLOSE_OK);
+        QCOMPARE(users()->count(), 3);
+        // Asked about one that went meanwhile.
+        tap(button("deleteTemplateButton"));
+        mPicker->slotDeleteUserTemplate(mFixture.userRoot() + "/UserTemplate_002/");
+        answer(MessageDefine::CLOSE_OK);
+        QCOMPARE(names(users()), QStringList({"UserTemplate_001", "UserTemplate_003"}));
+    }
+
+    void aTemplateThatCannotBeDeletedStays()
+    {
+        mFixture.makeUserTemplates(2);
+        openUserTab();
+        tapItem(users(), 1);
+        tap(button("deleteTemplateButton"));
+        const QString folder = mFixture.userRoot() + "/UserTemplate_002";
+        const QString root = QDir::cleanPath(mFixture.titleRoot() + "/../..");
+        QCOMPARE(::chmod(qPrintable(root), 0755), 0);
+        QCOMPARE(::chmod(qPrintable(folder), 0555), 0);
+        const int user = ::setfsuid(65534);
+        answer(MessageDefine::CLOSE_OK);
+        ::setfsuid(static_cast<uid_t>(user));
+        QCOMPARE(::chmod(qPrintable(folder), 0755), 0);
+        QCOMPARE(users()->count(), 2);
+        QVERIFY(users()->selectedItem());
+        QVERIFY(QFile::exists(mFixture.userTitle("UserTemplate_002")));
+        QVERIFY(mReports.take().isEmpty());
+    }
+
+    void savedAsTemplate()
+    {
+        mFixture.makeUserTemplates(3);
+        openUserTab();
+        mFixture.makeUserTemplate("UserTemplate_004", {"saved"});
+        mPicker->slotSaveAsTemplate("UserTemplate_004");
+        QCOMPARE(names(users()).last(), QString("UserTemplate_004"));
+        QCOMPARE(users()->archive(3)->getOrder(), std::string("4"));
+        QCOMPARE(mFixture.userOrder().last(), QString("UserTemplate_004"));
+        QCOMPARE(users()->item(3)->getIndex(), 3);
+        tapItem(users(), 3);
+        QCOMPARE(preview()->textLines().first(), QString("saved"));
+        QCOMPARE(fileName()->text(), QString("UserTemplate_004"));
+    }
+
+    void imports()
+    {
+        mFixture.makeUserTemplates(4);
+        openUserTab();
+        mFixture.makeUserPictures("新 import");
+        mPicker->slotImportNewUserTemplate("新 import");
+        QCOMPARE(names(users()).last(), QString("新 import"));
+        QVERIFY(users()->archive(4)->text().empty());
+        QVERIFY(QFile::exists(mFixture.userTitle("新 import")));
+        QCOMPARE(users()->item(4)->geometry().topLeft() - users()->item(0)->pos(), QPoint(0, 153));
+        // Over a name in use: the old one goes and the new one is the last.
+        tapItem(users(), 1);
+        mFixture.makeUserPictures("UserTemplate_002");
+        mPicker->slotImportNewUserTemplate(mFixture.userRoot() + "/UserTemplate_002");
+        QCOMPARE(names(users()), QStringList({"UserTemplate_001", "UserTemplate_003", "UserTemplate_004",
+                                              "新 import", "UserTemplate_002"}));
+        QCOMPARE(mFixture.userOrder(), names(users()));
+        QVERIFY(users()->archive(4)->text().empty());
+        QVERIFY(!users()->selectedItem());
+        QVERIFY(!button("deleteTemplateButton")->isEnabled());
+        verifyDense();
+        // Nothing to import.
+        for (const char* name : {"gone", "", "..", "/"})
+            mPicker->slotImportNewUserTemplate(name);
+        QCOMPARE(users()->count(), 5);
+        QCOMPARE(mFixture.userOrder().size(), 5);
+    }
+
+    void renames()
+    {
+        mFixture.makeUserTemplates(3);
+        openUserTab();
+        tapItem(users(), 1);
+        QVERIFY(QDir(mFixture.userRoot()).rename("UserTemplate_002", "片头"));
+        mPicker->slotRenameUserTemplate("UserTemplate_002", "片头", mFixture.userRoot() + "/片头/");
+        QCOMPARE(names(users()), QStringList({"UserTemplate_001", "片头", "UserTemplate_003"}));
+        QCOMPARE(fileName()->text(), QString("片头"));
+        QCOMPARE(users()->archive(1)->getPath(), mFixture.userTitle("片头").toStdString());
+        QCOMPARE(users()->archive(1)->getName(), std::string("片头/Titler"));
+        QCOMPARE(mFixture.userOrder(), names(users()));
+        UserTemplatePickerController controller;
+        QCOMPARE(controller.getLastSelectedTemplate(), mFixture.userTitle("片头").toStdString());
+        // One that is not chosen, told with its title file.
+        QVERIFY(QDir(mFixture.userRoot()).rename("UserTemplate_001", "x"));
+        mPicker->slotRenameUserTemplate("UserTemplate_001", "x", mFixture.userTitle("x"));
+        QCOMPARE(users()->archive(0)->getPath(), mFixture.userTitle("x").toStdString());
+        QCOMPARE(fileName()->text(), QString("片头"));
+        const QStringList before = mFixture.userOrder();
+        mPicker->slotRenameUserTemplate("unknown", "y", mFixture.userRoot() + "/y/");
+        QCOMPARE(names(users()), before);
+        QCOMPARE(mFixture.userOrder(), before);
+    }
+
+    void deletedOutside()
+    {
+        mFixture.makeUserTemplates(5);
+        openUserTab();
+        tapItem(users(), 2);
+        QVERIFY(QDir(mFixture.userRoot() + "/UserTemplate_003").removeRecursively());
+        mPicker->slotDeleteUserTemplate(mFixture.userTitle("UserTemplate_003"));
+        QCOMPARE(names(users()), QStringList({"UserTemplate_001", "UserTemplate_002", "UserTemplate_004",
+                                              "UserTemplate_005"}));
+        verifyDense();
+        QVERIFY(!users()->selectedItem());
+        QVERIFY(!button("selectUserButton")->isEnabled());
+        QCOMPARE(fileName()->text(), QString());
+        QCOMPARE(mFixture.userOrder(), names(users()));
+        mPicker->slotDeleteUserTemplate(mFixture.userRoot() + "/unknown/");
+        mPicker->slotDeleteUserTemplate("");
+        QCOMPARE(users()->count(), 4);
+        QVERIFY(mReports.take().isEmpty());
+        // The tap on what took the place of the gone one.
+        tapItem(users(), 2);
+        QCOMPARE(fileName()->text(), QString("UserTemplate_004"));
+    }
+
+    void deletedOutsideUnderTheFinger()
+    {
+        mFixture.makeUserTemplates(3);
+        openUserTab();
+        const QPoint point = centre(users()->item(0));
+        touch().press(0, point);
+        mPicker->slotDeleteUserTemplate(mFixture.userRoot() + "/UserTemplate_001/");
+        QCoreApplication::sendPostedEvents(nullptr, QEvent::DeferredDelete);
+        touch().release(0, point);
+        QVERIFY(!users()->selectedItem());
+        tapItem(users(), 1);
+        QCOMPARE(fileName()->text(), QString("UserTemplate_003"));
+    }
+
+    void theLastTemplateIsShown_data()
+    {
+        QTest::addColumn<int>("count");
+        QTest::newRow("one row") << 2;
+        QTest::newRow("a full row more than fits") << 20;
+        QTest::newRow("a new row") << 21;
+        QTest::newRow("the second of a row") << 22;
+    }
+
+    void theLastTemplateIsShown()
+    {
+        QFETCH(int, count);
+        mFixture.makeUserTemplates(count - 1);
+        makePicker();
+        QScrollBar* bar = users()->scrollArea()->verticalScrollBar();
+        // Hidden, as after the list has saved a template, and then while it is open.
+        for (int round = 0; round < 2; ++round) {
+            const QString name = QStringLiteral("saved %1").arg(round);
+            mFixture.makeUserTemplate(name);
+            mPicker->slotSaveAsTemplate(name);
+            mPicker->showUserTemplateTab();
+            show();
+            QVERIFY(users()->isVisible());
+            TemplateItem* last = users()->item(users()->count() - 1);
+            QTRY_VERIFY(!last->visibleRegion().isEmpty() &&
+                        last->visibleRegion().boundingRect() == last->rect());
+            QCOMPARE(bar->value(), bar->maximum());
+        }
+        // Once: later rows do not move what the operator looks at.
+        bar->setValue(0);
+        mFixture.makeUserTemplate("later 1");
+        for (int i = 0; i < 4; ++i) {
+            mFixture.makeUserPictures(QStringLiteral("later %1").arg(i));
+            mPicker->slotImportNewUserTemplate(QStringLiteral("later %1").arg(i));
+        }
+        QCoreApplication::processEvents();
+        QCOMPARE(bar->value(), 0);
+    }
+
+    void aDragScrollsAndTapsNothing()
+    {
+        mFixture.makeUserTemplates(40);
+        openUserTab();
+        QScrollBar* bar = users()->scrollArea()->verticalScrollBar();
+        bar->setValue(0);
+        const QPoint start = centre(users()->item(5));
+        touch().press(0, start);
+        touch().move(0, start - QPoint(0, 10));
+        touch().move(0, start - QPoint(0, 130));
+        QTRY_VERIFY(bar->value() >= 110);
+        QTRY_VERIFY(users()->scrollArea()->isFlickEnd());
+        touch().release(0, start - QPoint(0, 130));
+        QVERIFY(!users()->selectedItem());
+        tapItem(users(), 8);
+        QCOMPARE(users()->selectedItem(), users()->item(8));
+    }
+
+    void damagedPictures_data()
+    {
+        QTest::addColumn<QString>("kind");
+        for (const char* kind : {"none", "missing", "truncated", "no picture", "pipe", "too large", "wide"})
+            QTest::newRow(kind) << kind;
+    }
+
+    void damagedPictures()
+    {
+        QFETCH(QString, kind);
+        mFixture.makePresets("templates_en", {"whole", "bad"});
+        const QString path = mFixture.presetRoot() + "/templates_en/bad_240.png";
+        const QByteArray bytes = contents(path);
+        QVERIFY(QFile::remove(path));
+        if (kind == "none") {
+            write(path, bytes);
+            Archive archive;
+            archive.setPath((mFixture.presetRoot() + "/templates_en/bad.xml").toStdString());
+            QCOMPARE(ArchiveManager().saveArchive(&archive), 1);
+        } else if (kind == "truncated") {
+            write(path, bytes.left(bytes.size() / 3));
+        } else if (kind == "no picture") {
+            write(path, "text");
+        } else if (kind == "pipe") {
+            QCOMPARE(::mkfifo(qPrintable(path), 0644), 0);
+        } else if (kind == "too large") {
+            QImage(20000, 1000, QImage::Format_Mono).save(path);
+        } else if (kind == "wide") {
+            QImage image(4000, 100, QImage::Format_RGB32);
+            image.fill(Qt::red);
+            QVERIFY(image.save(path));
+        }
+        open();
+        QCOMPARE(presets()->count(), 2);
+        const QColor whole = middle(presets()->item(0));
+        QCOMPARE(whole, QColor(Qt::blue));
+        const QColor bad = middle(presets()->item(1));
+        if (kind == "wide")
+            QCOMPARE(bad, QColor(Qt::red));
+        else
+            QVERIFY2(bad.saturation() < 10, qPrintable(bad.name()));
+        tapItem(presets(), 1);
+        QCOMPARE(presets()->selectedItem(), presets()->item(1));
+    }
+
+    void framesOfTheItems()
+    {
+        mFixture.makePresets("templates_en", {"a", "b"});
+        open();
+        tapItem(presets(), 1);
+        const QImage normal = presets()->item(0)->grab().toImage();
+        const QImage chosen = presets()->item(1)->grab().toImage();
+        const QColor frame(0, 129, 255);
+        QCOMPARE(chosen.pixelColor(1, 70), frame);
+        QCOMPARE(chosen.pixelColor(246, 70), frame);
+        QVERIFY(normal.pixelColor(1, 70) != frame);
+        QCOMPARE(chosen.pixelColor(124, 71), QColor(Qt::blue));
+        QCOMPARE(normal.pixelColor(5, 70), QColor(Qt::blue));
+    }
+
+    void masks()
+    {
+        open();
+        mPicker->showDialogMaskWidget(true);
+        QWidget* mask = mPicker->childAt(100, 100);
+        QVERIFY(mask);
+        QCOMPARE(mask->geometry(), QRect(10, 6, 1371 - 19, 833 - 18));
+        QVERIFY(!mPicker->testAttribute(Qt::WA_AcceptTouchEvents));
+        mPicker->showMessageMaskWidget(true);
+        mPicker->showMessageMaskWidget(false);
+        QVERIFY(!mPicker->testAttribute(Qt::WA_AcceptTouchEvents));
+        mPicker->showDialogMaskWidget(false);
+        QVERIFY(mPicker->testAttribute(Qt::WA_AcceptTouchEvents));
+        mPicker->showMessageMaskWidget(true);
+        QVERIFY(!mPicker->testAttribute(Qt::WA_AcceptTouchEvents));
+        mPicker->showMessageMaskWidget(false);
+        QVERIFY(mPicker->testAttribute(Qt::WA_AcceptTouchEvents));
+    }
+
+    void menuOfAUserTemplate()
+    {
+        mFixture.makeUserTemplates(1);
+        mFixture.makePresets("templates_en", {"a"});
+        open();
+        UserTemplateMenu menu;
+        QStringList texts;
+        QList<int> types;
+        for (QAction* action : menu.actions()) {
+            texts.append(action->text());
+            types.append(qobject_cast<ArchiveAction*>(action)->getActionType());
+        }
+        QCOMPARE(texts, QStringList({"Create New", "Copy", "Paste", "Delete", "Add Template"}));
+        QCOMPARE(types, QList<int>({0, 1, 2, 3, 5}));
+        presets()->item(0)->showMenu();
+        QVERIFY(!presets()->item(0)->findChild<UserTemplateMenu*>());
+        users()->item(0)->showMenu();
+        auto* shown = users()->item(0)->findChild<UserTemplateMenu*>();
+        QVERIFY(shown && shown->isVisible());
+        shown->close();
+    }
+
+    void manyTemplates()
+    {
+        mFixture.makeUserTemplates(998);
+        openUserTab();
+        QCOMPARE(users()->count(), 998);
+        mPicker->showUserTemplateTab();
+        tapItem(users(), 997);
+        QCOMPARE(fileName()->text(), QString("UserTemplate_998"));
+        mPicker->slotDeleteUserTemplate(mFixture.userRoot() + "/UserTemplate_001/");
+        QCOMPARE(users()->item(0)->getIndex(), 0);
+        QCOMPARE(users()->count(), 997);
+        QCOMPARE(fileName()->text(), QString("UserTemplate_998"));
+    }
+
+private:
+    void makePicker() { mPicker = std::make_unique<TemplatePicker>(); }
+
+    void show()
+    {
+        mPicker->show();
+        QVERIFY(QTest::qWaitForWindowExposed(mPicker.get()));
+    }
+
+    void open()
+    {
+        makePicker();
+        show();
+    }
+
+    void openUserTab()
+    {
+        open();
+        mPicker->showUserTemplateTab();
+        QCoreApplication::processEvents();
+    }
+
+    TemplateTab* presets() const { return mPicker->presetTab(); }
+    TemplateTab* users() const { return mPicker->userTab(); }
+    KSPushbutton* button(const char* name) const { return mPicker->findChild<KSPushbutton*>(name); }
+    QLabel* fileName() const { return mPicker->findChild<QLabel*>("fileName"); }
+    ArchiveItem* preview() const { return mPicker->findChild<ArchiveItem*>(); }
+
+    static QStringList names(TemplateTab* tab)
+    {
+        QStringList result;
+        for (int i = 0; i < tab->count(); ++i)
+            result.append(TemplateTab::templateName(*tab->archive(i)));
+        return result;
+    }
+
+    QTest::QTouchEventWidgetSequence touch() { return QTest::touchEvent(mPicker.get(), mDevice); }
+    QPoint centre(QWidget* widget) const { return widget->mapTo(mPicker.get(), widget->rect().center()); }
+
+    void tap(QWidget* widget)
+    {
+        QVERIFY(widget->isVisible());
+        const QPoint point = centre(widget);
+        touch().press(0, point);
+        touch().release(0, point);
+    }
+
+    void tapItem(TemplateTab* tab, int index)
+    {
+        QCoreApplication::processEvents();
+        tap(tab->item(index));
+        QCOMPARE(tab->selectedItem(), tab->item(index));
+    }
+
+    void tapTab(int index)
+    {
+        auto* tabs = mPicker->findChild<TitlerTabWidget*>();
+        QTest::mouseClick(tabs->tabBar(), Qt::LeftButton, Qt::NoModifier,
+                          tabs->tabBar()->tabRect(index).center());
+        QCOMPARE(tabs->currentIndex(), index);
+    }
+
+    void answer(MessageDefine::_emCloseType type, int id = 43)
+    {
+        emit mMessages.signalCloseMessage({1, type, id});
+    }
+
+    void verifyDense()
+    {
+        QCoreApplication::processEvents();
+        for (int i = 0; i < users()->count(); ++i) {
+            QCOMPARE(users()->item(i)->getIndex(), i);
+            QCOMPARE(users()->item(i)->pos(), QPoint(i % 4 * 258, i / 4 * 153));
+        }
+    }
+
+    static QColor middle(TemplateItem* item)
+    {
+        return item->grab().toImage().pixelColor(item->rect().center());
+    }
+
+    static QByteArray contents(const QString& path)
+    {
+        QFile file(path);
+        return file.open(QIODevice::ReadOnly) ? file.readAll() : QByteArray();
+    }
+
+    static void write(const QString& path, const QByteArray& bytes)
+    {
+        QFile file(path);
+        if (file.open(QIODevice::WriteOnly))
+            file.write(bytes);
+    }
+
+    TemplateFixture mFixture;
+    TitleReportRecorder mReports;
+    MessageRecorder mMessages;
+    QPointingDevice* mDevice = QTest::createTouchDevice();
+    std::unique_ptr<TemplatePicker> mPicker;
+};
+
+QTEST_MAIN(TestTemplatePicker)
+#include "tst_templatepicker.moc"

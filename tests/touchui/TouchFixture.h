@@ -1,0 +1,53 @@
+#pragma once
+
+#include "touchui/KSAppEventFilter.h"
+
+#include <QCoreApplication>
+#include <QPointingDevice>
+#include <QTest>
+#include <QWidget>
+
+#include <memory>
+
+// A touch screen and the application's filter, as long as it lives, and short names for what fingers do.
+// Positions are in the coordinates of the widget.
+class TouchFixture
+{
+public:
+    TouchFixture() : filter(std::make_unique<KSAppEventFilter>()), m_device(QTest::createTouchDevice())
+    {
+        filter->registerLockObject(filter.get(), nullptr, LOCKOBJECT_DEFAULTMUTEX, nullptr);
+        QCoreApplication::instance()->installEventFilter(filter.get());
+    }
+    ~TouchFixture() { delete m_device; }
+
+    void press(QWidget* widget, const QPoint& position, int finger = 0) const
+    {
+        QTest::touchEvent(widget, m_device).press(finger, position, widget);
+    }
+    void move(QWidget* widget, const QPoint& position, int finger = 0) const
+    {
+        QTest::touchEvent(widget, m_device).move(finger, position, widget);
+    }
+    void lift(QWidget* widget, const QPoint& position, int finger = 0) const
+    {
+        QTest::touchEvent(widget, m_device).release(finger, position, widget);
+    }
+    void tap(QWidget* widget, const QPoint& position) const
+    {
+        press(widget, position);
+        lift(widget, position);
+    }
+    void cancel(QWidget* widget) const
+    {
+        QTouchEvent event(QEvent::TouchCancel, m_device);
+        QCoreApplication::sendEvent(widget, &event);
+    }
+    QPointingDevice* device() const { return m_device; }
+    bool isLocked() const { return filter->isLock(nullptr, LOCKMETHOD_TOUCH); }
+
+    std::unique_ptr<KSAppEventFilter> filter;
+
+private:
+    QPointingDevice* m_device;
+};

@@ -1,0 +1,12 @@
+#pragma once
+
+#include <QCommonStyle>
+
+// The base of the styles that paint from pictures: a plain style with the behaviour that suits a finger.
+class KSCommonStyle : public QCommonStyle
+{
+    Q_OBJECT
+public:
+    int styleHint(StyleHint hint, const QStyleOption* option = nullptr, const QWidget* widget = nullptr,
+                  QStyleHintReturn* returnData = nullptr) const override;
+};

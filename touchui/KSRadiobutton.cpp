@@ -1,0 +1,171 @@
+#include "touchui/KSRadiobutton.h"
+
+#include <QMouseEvent>
+#include <QPainter>
+#include <QTouchEvent>
+
+namespace
+{
+
+constexpr QSize PLAIN_PICTURE(36, 36);
+constexpr int GAP = 8;
+constexpr int TEXT_PIXELS = 24;
+const QColor TEXT_COLOR(220, 220, 220);
+const QColor DISABLED_COLOR(102, 102, 102);
+const QPoint OUTSIDE(-1, -1);
+
+} // namespace
+
+KSRadiobutton::KSRadiobutton(QWidget* parent) : QRadioButton(parent)
+{
+    init();
+}
+
+KSRadiobutton::KSRadiobutton(const QString& text, QWidget* parent) : QRadioButton(text, parent)
+{
+    init();
+}
+
+void KSRadiobutton::init()
+{
+    setAttribute(Qt::WA_AcceptTouchEvents);
+    setFocusPolicy(Qt::NoFocus);
+    QFont textFont = font();
+    textFont.setPixelSize(TEXT_PIXELS);
+    setFont(textFont);
+    setImagesPath(QStringLiteral(":/KSRadioButton"));
+}
+
+void KSRadiobutton::setImagesPath(const QString& folder)
+{
+    const char* const rows[] = {"Off", "On"};
+    const char* const columns[] = {"Rest", "Pressed", "Disabled"};
+    for (std::size_t row = 0; row < m_pictures.size(); ++row) {
+        for (std::size_t column = 0; column < m_pictures[row].size(); ++column) {
+            m_pictures[row][column] =
+                QPixmap(QStringLiteral("%1/Radiobutton_%2_%3")
+                            .arg(folder, QLatin1String(rows[row]), QLatin1String(columns[column])));
+        }
+    }
+    updateGeometry();
+    update();
+}
+
+QSize KSRadiobutton::pictureSize() const
+{
+    return m_pictures[0][0].isNull() ? PLAIN_PICTURE : m_pictures[0][0].size();
+}
+
+QSize KSRadiobutton::sizeHint() const
+{
+    const QSize picture = pictureSize();
+    if (text().isEmpty()) {
+        return picture;
+    }
+    return QSize(picture.width() + GAP + fontMetrics().horizontalAdvance(text()),
+                 qMax(picture.height(), fontMetrics().height()));
+}
+
+bool KSRadiobutton::hitButton(const QPoint& position) const
+{
+    return rect().contains(position);
+}
+
+bool KSRadiobutton::event(QEvent* event)
+{
+    switch (event->type()) {
+    case QEvent::TouchBegin:
+    case QEvent::TouchUpdate:
+    case QEvent::TouchEnd:
+        return onTouchEvent(static_cast<QTouchEvent*>(event));
+    case QEvent::TouchCancel:
+        cancelTouch();
+        return true;
+    default:
+        return QRadioButton::event(event);
+    }
+}
+
+bool KSRadiobutton::onTouchEvent(QTouchEvent* event)
+{
+    if (!isEnabled() || event->points().isEmpty()) {
+        return true;
+    }
+    if (event->type() == QEvent::TouchBegin) {
+        cancelTouch(); // an earlier touch whose end was lost
+        m_touchId = event->points().constFirst().id();
+        sendMouse(QEvent::MouseButtonPress, event->points().constFirst().position());
+        return true;
+    }
+    for (const QEventPoint& point : event->points()) {
+        if (point.id() != m_touchId) {
+            continue;
+        }
+        if (event->type() == QEvent::TouchEnd || point.state() == QEventPoint::State::Released) {
+            m_touchId = -1;
+            sendMouse(QEvent::MouseButtonRelease, point.position());
+        } else {
+            sendMouse(QEvent::MouseMove, point.position());
+        }
+        break;
+    }
+    return true;
+}
+
+void KSRadiobutton::sendMouse(QEvent::Type type, const QPointF& position)
+{
+    const QPoint place = position.toPoint();
+    const Qt::MouseButtons held = type == QEvent::MouseButtonRelease ? Qt::NoButton : Qt::LeftButton;
+    QMouseEvent event(type, place, mapToGlobal(place),
+                      type == QEvent::MouseMove ? Qt::NoButton : Qt::LeftButton, held, Qt::NoModifier);
+    if (type == QEvent::MouseButtonPress) {
+        mousePressEvent(&event);
+    } else if (type == QEvent::MouseMove) {
+        mouseMoveEvent(&event);
+    } else {
+        mouseReleaseEvent(&event);
+    }
+}
+
+// The button comes up and nothing is chosen.
+void KSRadiobutton::cancelTouch()
+{
+    if (m_touchId == -1) {
+        return;
+    }
+    m_touchId = -1;
+    sendMouse(QEvent::MouseMove, OUTSIDE);
+    sendMouse(QEvent::MouseButtonRelease, OUTSIDE);
+}
+
+void KSRadiobutton::changeEvent(QEvent* event)
+{
+    if (event->type() == QEvent::EnabledChange && !isEnabled()) {
+        m_touchId = -1;
+    }
+    QRadioButton::changeEvent(event);
+}
+
+void KSRadiobutton::paintEvent(QPaintEvent*)
+{
+    QPainter painter(this);
+    const std::size_t column = !isEnabled() ? 2 : isDown() ? 1 : 0;
+    const QPixmap& picture = m_pictures[isChecked() ? 1 : 0][column];
+    const QSize size = pictureSize();
+    const QRect place(QPoint(0, (height() - size.height()) / 2), size);
+    if (picture.isNull()) {
+        painter.setRenderHint(QPainter::Antialiasing);
+        painter.setPen(isEnabled() ? TEXT_COLOR : DISABLED_COLOR);
+        painter.setBrush(isChecked() ? painter.pen().brush() : Qt::NoBrush);
+        painter.drawEllipse(place.adjusted(6, 6, -6, -6));
+    } else {
+        painter.drawPixmap(place, picture);
+    }
+    if (text().isEmpty()) {
+        return;
+    }
+    painter.setFont(font());
+    painter.setPen(isEnabled() ? TEXT_COLOR : DISABLED_COLOR);
+    painter.drawText(rect().adjusted(size.width() + GAP, 0, 0, 0),
+                     Qt::AlignLeft | Qt::AlignVCenter | Qt::TextSingleLine, text());
+}

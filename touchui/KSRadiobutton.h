@@ -1,0 +1,41 @@
+#pragma once
+
+#include <QEvent>
+#include <QPixmap>
+#include <QRadioButton>
+
+#include <array>
+
+class QTouchEvent;
+
+// A radio button for one finger, painted from the pictures under ":/KSRadioButton" or another folder:
+// Radiobutton_On_Rest, Radiobutton_On_Pressed, Radiobutton_On_Disabled and the same with Off.
+class KSRadiobutton : public QRadioButton
+{
+    Q_OBJECT
+public:
+    explicit KSRadiobutton(QWidget* parent = nullptr);
+    explicit KSRadiobutton(const QString& text, QWidget* parent = nullptr);
+
+    // A resource folder with pictures of those names.
+    void setImagesPath(const QString& folder);
+
+    QSize sizeHint() const override;
+    QSize minimumSizeHint() const override { return sizeHint(); }
+
+protected:
+    bool event(QEvent* event) override;
+    void paintEvent(QPaintEvent* event) override;
+    bool hitButton(const QPoint& position) const override;
+    void changeEvent(QEvent* event) override;
+
+private:
+    void init();
+    bool onTouchEvent(QTouchEvent* event);
+    void sendMouse(QEvent::Type type, const QPointF& position);
+    void cancelTouch();
+    QSize pictureSize() const;
+
+    std::array<std::array<QPixmap, 3>, 2> m_pictures; // off and on; rest, pressed, disabled
+    int m_touchId = -1;
+};

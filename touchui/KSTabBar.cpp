@@ -1,0 +1,221 @@
+#include "touchui/KSTabBar.h"
+
+#include "touchui/KSTabStyle.h"
+
+#include <QMouseEvent>
+#include <QPalette>
+#include <QTouchEvent>
+
+namespace
+{
+
+constexpr int TEXT_MARGIN = 24;
+constexpr int LEAST_WIDTH = 120;
+constexpr int ICON_ROOM = 40;
+const QColor TEXT_COLOR(160, 160, 160);
+const QColor SELECTED_TEXT(220, 220, 220);
+const QColor BACKGROUND(50, 50, 50);
+
+} // namespace
+
+KSTabBar::KSTabBar(QWidget* parent) : QTabBar(parent), m_style(new KSTabStyle)
+{
+    m_style->setParent(this);
+    setStyle(m_style);
+    setAttribute(Qt::WA_AcceptTouchEvents);
+    setFocusPolicy(Qt::NoFocus);
+    setDrawBase(false);
+    setExpanding(false);
+    QFont textFont = font();
+    textFont.setPixelSize(TEXT_PIXELS);
+    setFont(textFont);
+    QPalette colors = palette();
+    for (const QPalette::ColorGroup group : {QPalette::Active, QPalette::Inactive, QPalette::Disabled}) {
+        colors.setColor(group, QPalette::WindowText, TEXT_COLOR);
+        colors.setColor(group, QPalette::BrightText, SELECTED_TEXT);
+        colors.setColor(group, QPalette::Window, BACKGROUND);
+    }
+    setPalette(colors);
+}
+
+void KSTabBar::setImages(const QString& images)
+{
+    m_style->setImages(images);
+    update();
+}
+
+bool KSTabBar::isUpright() const
+{
+    switch (shape()) {
+    case RoundedWest:
+    case RoundedEast:
+    case TriangularWest:
+    case TriangularEast:
+        return true;
+    default:
+        return false;
+    }
+}
+
+void KSTabBar::setTabSizeHint(int index, const QSize& size)
+{
+    if (index < 0 || index >= m_sizes.size()) {
+        return;
+    }
+    m_sizes[index] = size;
+    // The base lays its tabs out again only when one of them changes.
+    setTabText(index, tabText(index) + QLatin1Char(' '));
+    setTabText(index, tabText(index).chopped(1));
+    updateGeometry();
+}
+
+QSize KSTabBar::textSize(int index) const
+{
+    const int icon = tabIcon(index).isNull() ? 0 : ICON_ROOM;
+    const int width = fontMetrics().horizontalAdvance(tabText(index)) + 2 * TEXT_MARGIN + icon;
+    const QSize size(qMax(LEAST_WIDTH, width), TAB_HEIGHT);
+    return isUpright() ? size.transposed() : size;
+}
+
+QSize KSTabBar::tabSizeHint(int index) const
+{
+    const QSize size = m_sizes.value(index);
+    return size.isValid() ? size : textSize(index);
+}
+
+QSize KSTabBar::sizeHint() const
+{
+    QSize size(0, 0);
+    for (int i = 0; i < count(); ++i) {
+        if (!isTabVisible(i)) {
+            continue;
+        }
+        const QSize tab = tabSizeHint(i);
+        size = isUpright() ? QSize(qMax(size.width(), tab.width()), size.height() + tab.height())
+                           : QSize(size.width() + tab.width(), qMax(size.height(), tab.height()));
+    }
+    return size;
+}
+
+void KSTabBar::tabInserted(int index)
+{
+    m_sizes.insert(qBound(qsizetype(0), qsizetype(index), m_sizes.size()), QSize());
+    setPressedTab(-1);
+    m_pressStart = -1;
+    QTabBar::tabInserted(index);
+}
+
+void KSTabBar::tabRemoved(int index)
+{
+    if (index >= 0 && index < m_sizes.size()) {
+        m_sizes.removeAt(index);
+    }
+    setPressedTab(-1);
+    m_pressStart = -1;
+    QTabBar::tabRemoved(index);
+}
+
+bool KSTabBar::event(QEvent* event)
+{
+    switch (event->type()) {
+    case QEvent::TouchBegin:
+    case QEvent::TouchUpdate:
+    case QEvent::TouchEnd:
+        return onTouchEvent(static_cast<QTouchEvent*>(event));
+    case QEvent::TouchCancel:
+        m_touchId = -1;
+        m_pressStart = -1;
+        setPressedTab(-1);
+        return true;
+    default:
+        return QTabBar::event(event);
+    }
+}
+
+bool KSTabBar::onTouchEvent(QTouchEvent* event)
+{
+    if (!isEnabled() || event->points().isEmpty()) {
+        return true;
+    }
+    if (event->type() == QEvent::TouchBegin) {
+        m_touchId = event->points().constFirst().id();
+        pressAt(event->points().constFirst().position().toPoint());
+        return true;
+    }
+    for (const QEventPoint& point : event->points()) {
+        if (point.id() != m_touchId) {
+            continue;
+        }
+        if (event->type() == QEvent::TouchEnd || point.state() == QEventPoint::State::Released) {
+            m_touchId = -1;
+            releaseAt(point.position().toPoint());
+        } else {
+            moveTo(point.position().toPoint());
+        }
+        break;
+    }
+    return true;
+}
+
+void KSTabBar::mousePressEvent(QMouseEvent* event)
+{
+    if (event->button() == Qt::LeftButton && m_touchId == -1) {
+        pressAt(event->position().toPoint());
+    }
+}
+
+void KSTabBar::mouseMoveEvent(QMouseEvent* event)
+{
+    if (m_touchId == -1) {
+        moveTo(event->position().toPoint());
+    }
+}
+
+void KSTabBar::mouseReleaseEvent(QMouseEvent* event)
+{
+    if (event->button() == Qt::LeftButton && m_touchId == -1) {
+        releaseAt(event->position().toPoint());
+    }
+}
+
+void KSTabBar::hideEvent(QHideEvent* event)
+{
+    m_touchId = -1;
+    m_pressStart = -1;
+    setPressedTab(-1);
+    QTabBar::hideEvent(event);
+}
+
+void KSTabBar::pressAt(const QPoint& position)
+{
+    const int index = tabAt(position);
+    m_pressStart = index >= 0 && isTabEnabled(index) ? index : -1;
+    setPressedTab(m_pressStart);
+}
+
+void KSTabBar::moveTo(const QPoint& position)
+{
+    setPressedTab(m_pressStart >= 0 && tabAt(position) == m_pressStart ? m_pressStart : -1);
+}
+
+void KSTabBar::releaseAt(const QPoint& position)
+{
+    moveTo(position);
+    const int index = m_pressedTab;
+    m_pressStart = -1;
+    setPressedTab(-1);
+    if (index < 0) {
+        return;
+    }
+    setCurrentIndex(index);
+    Q_EMIT tabBarClicked(index);
+}
+
+void KSTabBar::setPressedTab(int index)
+{
+    if (m_pressedTab != index) {
+        m_pressedTab = index;
+        m_style->setPressedTab(index);
+        update();
+    }
+}
