@@ -19,9 +19,13 @@
 #include "library/ArchiveList.h"
 #include "library/ThumbnailRender.h"
 #include "messaging/services/ISoftKeyBoardController.h"
+#include "panel/TextToolsPanel.h"
 #include "support/LogManager.h"
+#include "touchui/Balloon.h"
 #include "touchui/KSInputContext.h"
+#include "touchui/KSMenu.h"
 #include "touchui/KSPushbutton.h"
+#include "touchui/KSToolTip.h"
 
 #include <QAction>
 #include <QApplication>
@@ -79,6 +83,7 @@ TitlerWindow::TitlerWindow(bool deferArchiveList, QWidget* parent)
     INIT_LOGGING(L"KS2Titler");
     setAppDefaultParameter();
     setAttribute(Qt::WA_AcceptTouchEvents);
+    KSMenu::setMainWindow(this);
     ICanvasHost::setInstance(this);
     MessageBoxController::setProvider(
         []() -> MessageBoxController* { return ShowMessageController::getInstance(); },
@@ -94,6 +99,8 @@ TitlerWindow::TitlerWindow(bool deferArchiveList, QWidget* parent)
     initWindowWidget();
     initChildWindows();
     connectWidget();
+    Balloon::s_ParentWindow = this;
+    KSToolTip::s_mainWindow = this;
     initProcessFactory();
     initProcessCommunications();
     connectForController();
@@ -106,6 +113,11 @@ TitlerWindow::~TitlerWindow()
 {
     // The canvas must be gone before the service links that its workers report through.
     mUndoStack.clear();
+    delete mTextToolsPanel;
+    KSToolTip::clearInstance();
+    KSToolTip::s_mainWindow = nullptr;
+    Balloon::s_ParentWindow = nullptr;
+    KSMenu::setMainWindow(nullptr);
     delete mArchiveList;
     delete mGraphicsView;
     delete mCanvasScene;
@@ -146,6 +158,7 @@ void TitlerWindow::initWindowWidget()
     createToolsBar();
     createCanvasScene();
     createArchiveList();
+    createTextToolsPanel();
 
     auto* mainRow = newLayout<QHBoxLayout>();
     mainRow->addSpacing(8);
@@ -202,6 +215,11 @@ void TitlerWindow::createArchiveList()
     mArchiveList->setFixedSize(ARCHIVELISTWIDGET_WIDTH, ARCHIVELISTWIDGET_HEIGHT);
 }
 
+void TitlerWindow::createTextToolsPanel()
+{
+    mTextToolsPanel = new TextToolsPanel(this);
+}
+
 QWidget* TitlerWindow::createLeftColumn()
 {
     auto* titleRow = newLayout<QHBoxLayout>();
@@ -242,6 +260,7 @@ QLayout* TitlerWindow::createRightColumn()
     column->addSpacing(22);
     column->addLayout(canvasRow);
     column->addSpacing(43);
+    column->addWidget(mTextToolsPanel);
     column->addStretch();
     return column;
 }

@@ -38,6 +38,7 @@ class QUndoCommand;
 class ShowMessageController;
 class ShowTitlerController;
 class SystemSetupInfoController;
+class TextToolsPanel;
 class TitlerAPPEventFilterController;
 class TitlerPowerController;
 class TitlerProjectDataController;
@@ -125,8 +126,14 @@ public slots:
     void setHasMessageToShowInformation(bool isNeedShow, QString defaultFont);
 
     // Lock reporting.
+    void slotShowEdgeSlider(bool isShow);
     void slotShowCanvasMenu(bool isShow);
+    void slotShowFontFamilyComboxList(bool isShow);
+    void slotShowFontSizeComboxList(bool isShow);
+    void slotHideEdgeSlider();
     void slotHideCanvasMenu();
+    void slotHideFontFamilyComboxList();
+    void slotHideFontSizeComboxList();
     void slotShowDialogMaskWidget(bool isShow);
     void slotShowMessageMaskWidget(bool isShow);
 
@@ -145,6 +152,7 @@ private:
     void createToolsBar();
     void createCanvasScene();
     void createArchiveList();
+    void createTextToolsPanel();
     QWidget* createLeftColumn();
     QLayout* createRightColumn();
     void initChildWindows();
@@ -155,13 +163,16 @@ private:
     void connectForToolsBar();
     void connectForMainScene();
     void connectForTextToolsAndArchiveList();
+    void connectForTextToolsPanel();
     void connectForUndoRedoCommand();
     void connectForController();
 
     bool ignoreMouseAndTouchEventWhenArchiveListIsMoveMode(QObject* obj, QEvent* event);
+    bool ignoreTouchEventWhenSliderIsShowing(QObject* obj, QEvent* event) const;
     void leaveTextEditing(bool deleteEmptyItems);
     void changeMoveMode(bool on);
     void sendTransientControlEvent(bool on);
+    void reportHiddenControl();
 
     void showDialogMaskWidget(bool show);
     void showMessageMaskWidget(bool show);
@@ -183,6 +194,7 @@ private:
     ArchiveList* mArchiveList = nullptr;
     QLabel* mPathLabel = nullptr;
     QPushButton* mFolderIcon = nullptr;
+    TextToolsPanel* mTextToolsPanel = nullptr;
     KSPushbutton* mMoveButton = nullptr;
     QUndoStack mUndoStack;
     QWidget* mOpacityMask = nullptr;

@@ -9,6 +9,7 @@
 #include "canvas/CanvasScene.h"
 #include "document/Archive.h"
 #include "library/ArchiveList.h"
+#include "panel/TextToolsPanel.h"
 #include "touchui/KSInputContext.h"
 
 #include <QAction>
@@ -39,6 +40,8 @@ void TitlerWindow::showTitlerWindow(titler_paramter paramter)
         mShowMessageController->setMessageMainWindow(this);
     }
     mCanvasScene->setModuleInfo(m_emModuleInfo);
+    mTextToolsPanel->setModuleInfo(m_emModuleInfo);
+    mTextToolsPanel->initTextToolsPanel();
 
     mToolsBar->setFolderButtonEnabled(false); // there is no picker to open
     m_bEditByMain = paramter.mode == _titler_paramter::CREATE_OR_EDIT;
@@ -95,7 +98,9 @@ void TitlerWindow::closeTitlerWindow()
     const QString path = mArchiveList->getCurrentPath();
     saveCurrentTitle();
     clearUndoStack();
+    mTextToolsPanel->setSignalValue(false);
     mArchiveList->synchronizationFolderFile();
+    mTextToolsPanel->initTextToolsPanel();
     if (!path.isEmpty() && mEditTitlerController)
         mEditTitlerController->editFolderEndStatus(path);
     mToolsBar->resetToDefaultState();

@@ -6,6 +6,7 @@
 #include "canvas/CanvasScene.h"
 #include "canvas/GraphicsView.h"
 #include "library/ArchiveList.h"
+#include "panel/TextToolsPanel.h"
 #include "support/SystemInfo.h"
 #include "touchui/KSPushbutton.h"
 
@@ -16,6 +17,7 @@
 #include <QMenu>
 #include <QMouseEvent>
 #include <QPalette>
+#include <QSlider>
 #include <QTouchEvent>
 #include <QTranslator>
 
@@ -74,7 +76,20 @@ bool TitlerWindow::eventFilter(QObject* obj, QEvent* event)
     default:
         break;
     }
-    return false;
+    return ignoreTouchEventWhenSliderIsShowing(obj, event);
+}
+
+// While the slider of the edge is open, fingers work nothing else.
+bool TitlerWindow::ignoreTouchEventWhenSliderIsShowing(QObject* obj, QEvent* event) const
+{
+    switch (event->type()) {
+    case QEvent::TouchBegin:
+    case QEvent::TouchUpdate:
+    case QEvent::TouchEnd:
+        return obj && !qobject_cast<QSlider*>(obj) && mTextToolsPanel->edgeSliderIsShown();
+    default:
+        return false;
+    }
 }
 
 bool TitlerWindow::ignoreMouseAndTouchEventWhenArchiveListIsMoveMode(QObject* obj, QEvent* event)
@@ -165,16 +180,54 @@ void TitlerWindow::sendTransientControlEvent(bool on)
         mTitlerAPPEventFilterController->sendAPPEvent(APPEventDefine::LOCKTYPE_OBJECT, on);
 }
 
+void TitlerWindow::reportHiddenControl()
+{
+    if (WINDOW_IS_SHOWN)
+        sendTransientControlEvent(false);
+}
+
+void TitlerWindow::slotShowEdgeSlider(bool isShow)
+{
+    sendTransientControlEvent(isShow);
+}
+
 void TitlerWindow::slotShowCanvasMenu(bool isShow)
 {
     sendTransientControlEvent(isShow);
 }
 
+void TitlerWindow::slotShowFontFamilyComboxList(bool isShow)
+{
+    sendTransientControlEvent(isShow);
+}
+
+void TitlerWindow::slotShowFontSizeComboxList(bool isShow)
+{
+    sendTransientControlEvent(isShow);
+}
+
+void TitlerWindow::slotHideEdgeSlider()
+{
+    mTextToolsPanel->hideEdgeSlider();
+    reportHiddenControl();
+}
+
 void TitlerWindow::slotHideCanvasMenu()
 {
     mToolsBar->hideCanvasMenu();
-    if (WINDOW_IS_SHOWN)
-        sendTransientControlEvent(false);
+    reportHiddenControl();
+}
+
+void TitlerWindow::slotHideFontFamilyComboxList()
+{
+    mTextToolsPanel->hideFontFamilyComboxList();
+    reportHiddenControl();
+}
+
+void TitlerWindow::slotHideFontSizeComboxList()
+{
+    mTextToolsPanel->hideFontSizeComboxList();
+    reportHiddenControl();
 }
 
 QWidget* TitlerWindow::createMask() const
@@ -210,6 +263,8 @@ void TitlerWindow::showDialogMaskWidget(bool show)
     }
     mDialogMask->setVisible(show);
     setAttribute(Qt::WA_AcceptTouchEvents, !show);
+    if (!show || mTextToolsPanel->colorPaletteIsShown())
+        mTextToolsPanel->showDialogMaskWidget(show);
 }
 
 void TitlerWindow::showMessageMaskWidget(bool show)
@@ -225,6 +280,8 @@ void TitlerWindow::showMessageMaskWidget(bool show)
     mMessageMask->setVisible(show);
     const bool isDialogMasked = mDialogMask && mDialogMask->isVisible();
     setAttribute(Qt::WA_AcceptTouchEvents, !show && !isDialogMasked);
+    if (!show || mTextToolsPanel->colorPaletteIsShown())
+        mTextToolsPanel->showMessageMaskWidget(show);
 }
 
 void TitlerWindow::slotSystemLanguageChanged(SystemSetupDef::emSystemLanguageType systemLanguage)
@@ -236,12 +293,14 @@ void TitlerWindow::slotSystemLanguageChanged(SystemSetupDef::emSystemLanguageTyp
 void TitlerWindow::slotInputLanguageChanged(SystemSetupDef::emInputLanguageType inputLanguage)
 {
     mCanvasScene->slotSceneInputLanguageChanged(inputLanguage);
+    mTextToolsPanel->displayInputLanguage(inputLanguage);
 }
 
 void TitlerWindow::slotGetModuleInfo(SystemSetupDef::emInformationModel moduleInfo)
 {
     m_emModuleInfo = moduleInfo;
     mCanvasScene->setModuleInfo(moduleInfo);
+    mTextToolsPanel->setModuleInfo(moduleInfo);
 }
 
 void TitlerWindow::switchTranslator(SystemSetupDef::emSystemLanguageType type)
@@ -263,6 +322,7 @@ void TitlerWindow::retranslateUI()
 {
     setWindowTitle(tr("Titler"));
     mMoveButton->setText(archiveListIsMoveMode() ? tr("Done") : tr("Move"));
+    mTextToolsPanel->translateText();
     mToolsBar->translateText();
     mArchiveList->translateText();
 }

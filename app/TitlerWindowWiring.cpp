@@ -3,6 +3,7 @@
 #include "app/TitlerWindow.h"
 
 #include "app/EditContextController.h"
+#include "app/EditTitlerController.h"
 #include "app/ShowMessageController.h"
 #include "app/ShowTitlerController.h"
 #include "app/SystemSetupInfoController.h"
@@ -12,6 +13,7 @@
 #include "canvas/CanvasScene.h"
 #include "library/ArchiveItem.h"
 #include "library/ArchiveList.h"
+#include "panel/TextToolsPanel.h"
 #include "touchui/KSPushbutton.h"
 
 void TitlerWindow::connectWidget()
@@ -19,6 +21,7 @@ void TitlerWindow::connectWidget()
     connectForToolsBar();
     connectForMainScene();
     connectForTextToolsAndArchiveList();
+    connectForTextToolsPanel();
     connect(mArchiveList, &ArchiveList::signalStartPasteArchive, this, &TitlerWindow::slotStartPasteArchive);
     connect(this, &TitlerWindow::moveButtonClicked, mArchiveList, &ArchiveList::moveButtonClicked);
     connectForUndoRedoCommand();
@@ -72,6 +75,40 @@ void TitlerWindow::connectForTextToolsAndArchiveList()
     connect(mMoveButton, &QPushButton::clicked, this, &TitlerWindow::hideSoftWareWithDeleteEmptyItems);
 }
 
+void TitlerWindow::connectForTextToolsPanel()
+{
+    // What is selected is shown.
+    connect(mCanvasScene, &CanvasScene::signalSceneNotifyIfExistSelectedObject, mTextToolsPanel,
+            &TextToolsPanel::changeFontPropertyBtnStatus);
+    connect(mCanvasScene, &CanvasScene::signalNotifyPropertyAreaUpdateCurrentTextStyle, mTextToolsPanel,
+            &TextToolsPanel::updateTextStyle);
+    connect(mCanvasScene, &CanvasScene::signalSceneNotifyTextPropertyAreaObjectSelectionMode, mTextToolsPanel,
+            &TextToolsPanel::selectionModeForShadowAndAlign);
+    connect(mCanvasScene, &CanvasScene::signalBeginNewTextItem, mTextToolsPanel,
+            &TextToolsPanel::slotBeginNewTextItem);
+    connect(mCanvasScene, &CanvasScene::signalSceneSoftWareClosedWhenEditObject, mTextToolsPanel,
+            &TextToolsPanel::slotHideColorPaletteWhenCloseSoftWare);
+    // What is changed goes to the canvas.
+    connect(mTextToolsPanel, &TextToolsPanel::signalNotifyEditAreaSizeToolBoxEditDone, mCanvasScene,
+            &CanvasScene::slotNotifyEditAreaSizeToolBoxEditDone);
+    connect(mTextToolsPanel, &TextToolsPanel::textStyleChange, mCanvasScene,
+            &CanvasScene::slotChangeObjectTextStyle);
+    connect(mTextToolsPanel, &TextToolsPanel::signalUpdateCurrentTextProperty, mCanvasScene,
+            &CanvasScene::slotUpdateCurrentTextProperty);
+    // Controls that are open for the moment, fonts and places.
+    connect(mTextToolsPanel, &TextToolsPanel::signalShowEdgeSlider, this, &TitlerWindow::slotShowEdgeSlider);
+    connect(mToolsBar, &ToolsBar::signalShowCanvasMenu, mTextToolsPanel,
+            &TextToolsPanel::slotAbsoluteShowCanvasMenu);
+    connect(mTextToolsPanel, &TextToolsPanel::signalShowFontFamilyComboxList, this,
+            &TitlerWindow::slotShowFontFamilyComboxList);
+    connect(mTextToolsPanel, &TextToolsPanel::signalShowFontSizeComboxList, this,
+            &TitlerWindow::slotShowFontSizeComboxList);
+    connect(this, &TitlerWindow::modifyFontComboxItem, mTextToolsPanel,
+            &TextToolsPanel::modifyFontFamilyComboxItem);
+    connect(this, &TitlerWindow::titlerWindowGeometry, mTextToolsPanel,
+            &TextToolsPanel::titlerWindowRectSlot);
+}
+
 void TitlerWindow::connectForUndoRedoCommand()
 {
     connect(mArchiveList, &ArchiveList::deleteCommandSignal, this, &TitlerWindow::pushUndoStack);
@@ -101,7 +138,15 @@ void TitlerWindow::connectForController()
     connect(mTitlerAPPEventFilterController, &TitlerAPPEventFilterController::signalRestoreOriginal, this,
             &TitlerWindow::slotCancelArchiveListMoveMode);
     connect(mTitlerAPPEventFilterController, &TitlerAPPEventFilterController::signalRestoreOriginal, this,
+            &TitlerWindow::slotHideEdgeSlider);
+    connect(mTitlerAPPEventFilterController, &TitlerAPPEventFilterController::signalRestoreOriginal, this,
             &TitlerWindow::slotHideCanvasMenu);
+    connect(mTitlerAPPEventFilterController, &TitlerAPPEventFilterController::signalRestoreOriginal, this,
+            &TitlerWindow::slotHideFontFamilyComboxList);
+    connect(mTitlerAPPEventFilterController, &TitlerAPPEventFilterController::signalRestoreOriginal, this,
+            &TitlerWindow::slotHideFontSizeComboxList);
+    connect(mEditTitlerController, &EditTitlerController::importNewFontFamilies, mTextToolsPanel,
+            &TextToolsPanel::slotImportNewFontFamlies);
     connect(MessageBoxController::getInstance(), &MessageBoxController::signalCloseMessage, this,
             &TitlerWindow::continueCloseTitler);
     connect(mShowMessageController, &ShowMessageController::signalsShowDialogMaskWidget, this,

@@ -77,10 +77,10 @@ void fillFading(QPainter& painter, const QRectF& area, const QColor& color, doub
 
 void paintLowerThird(QPainter& painter)
 {
-    const QRectF plate(0, 762, 1731, 201);
-    fillFading(painter, plate, withAlpha(NAVY, 236), 0.72);
-    fillFading(painter, QRectF(0, 762, 1731, 3), withAlpha(BLUE, 255), 0.5);
-    fillFading(painter, QRectF(0, 960, 1731, 3), withAlpha(NAVY_LIGHT, 255), 0.5);
+    const QRectF plate(0, 762, 1857, 201);
+    fillFading(painter, plate, withAlpha(NAVY, 236), 0.8);
+    fillFading(painter, QRectF(0, 762, 1857, 3), withAlpha(BLUE, 255), 0.5);
+    fillFading(painter, QRectF(0, 960, 1857, 3), withAlpha(NAVY_LIGHT, 255), 0.5);
     fillDown(painter, QRectF(156, 786, 12, 153), AMBER, AMBER.darker(120));
 }
 

@@ -1,7 +1,7 @@
 // The records of the preset templates.
 //
-// Text stands inside the title-safe area (80 % of the picture). Sizes and colours are ones that the panel
-// offers, so that an operator who changes a word finds the style of the rest marked there.
+// Text stands inside the title-safe area (80 % of the picture). Sizes are steps of the panel's ladder, so
+// that an operator who adds a word can give it the size of its neighbour by tapping.
 #pragma once
 
 #include "appliance/SampleTitles.h"

@@ -45,18 +45,27 @@ QColor CustomComboBoxDelegate::rowColor(const QModelIndex& index)
     return color;
 }
 
-void CustomComboBoxDelegate::paint(QPainter* painter, const QStyleOptionViewItem& option,
-                                   const QModelIndex& index) const
+bool CustomComboBoxDelegate::paintCursor(QPainter* painter, const QStyleOptionViewItem& option,
+                                         const QModelIndex& index) const
 {
     const bool enabled = (index.flags() & Qt::ItemIsEnabled) && (option.state & QStyle::State_Enabled);
     const auto* view = qobject_cast<const CustomComboBoxView*>(option.widget);
     const QModelIndex pressed = view != nullptr ? view->pressedIndex() : QModelIndex();
     const bool marked = pressed.isValid() ? pressed == index : bool(option.state & QStyle::State_Selected);
-    painter->save();
     if (marked && enabled) {
+        painter->save();
         painter->setRenderHint(QPainter::SmoothPixmapTransform);
         painter->drawPixmap(option.rect, m_cursor);
+        painter->restore();
     }
+    return enabled;
+}
+
+void CustomComboBoxDelegate::paint(QPainter* painter, const QStyleOptionViewItem& option,
+                                   const QModelIndex& index) const
+{
+    const bool enabled = paintCursor(painter, option, index);
+    painter->save();
     QRect area = option.rect.adjusted(TEXT_MARGIN, 0, -TEXT_MARGIN, 0);
     if (m_colorPallete && rowColor(index).isValid()) {
         const QRect swatch = area.adjusted(0, SWATCH_MARGIN, 0, -SWATCH_MARGIN);

@@ -25,6 +25,10 @@ public:
     // The invalid colour for a row without one.
     static QColor rowColor(const QModelIndex& index);
 
+protected:
+    // The cursor behind the chosen or pressed row; whether the row is enabled.
+    bool paintCursor(QPainter* painter, const QStyleOptionViewItem& option, const QModelIndex& index) const;
+
 private:
     QPixmap m_cursor;
     bool m_colorPallete = false;

@@ -1,6 +1,8 @@
 #include "touchui/CustomComboBoxView.h"
 
 #include "touchui/FlickMotion.h"
+#include "touchui/KSScrollBar.h"
+#include "touchui/TouchClock.h"
 
 #include <QKeyEvent>
 #include <QMouseEvent>
@@ -23,11 +25,17 @@ CustomComboBoxView::CustomComboBoxView(QWidget* parent)
     setFrameShape(QFrame::NoFrame);
     setVerticalScrollMode(QAbstractItemView::ScrollPerPixel);
     setHorizontalScrollBarPolicy(Qt::ScrollBarAlwaysOff);
+    setVerticalScrollBar(new KSScrollBar(Qt::Vertical));
     setEditTriggers(QAbstractItemView::NoEditTriggers);
     setSelectionMode(QAbstractItemView::SingleSelection);
     setFocusPolicy(Qt::NoFocus);
     setUniformItemSizes(true);
     setStyleSheet(QStringLiteral("QListView { background: transparent; border: 0px; }"));
+}
+
+CustomComboBoxView::~CustomComboBoxView()
+{
+    CustomComboBoxView::stopFlick();
 }
 
 bool CustomComboBoxView::onTouchEvent(QTouchEvent* event)
@@ -149,9 +157,9 @@ void CustomComboBoxView::setStartPoint(const QPoint& point)
 void CustomComboBoxView::setEndPoint(const QPoint& point)
 {
     m_endPoint = point;
-    if (!isFlickEnd() && !m_flickTimer.isActive()) {
+    if (!isFlickEnd() && m_flickTimerId == 0) {
         m_scrollValue = verticalScrollBar()->value();
-        m_flickTimer.start(RULES.interval, Qt::PreciseTimer, this);
+        m_flickTimerId = TouchClock::instance().start(this, RULES.interval);
         m_hasFlicked = true;
     }
 }
@@ -163,7 +171,10 @@ bool CustomComboBoxView::isFlickEnd() const
 
 void CustomComboBoxView::stopFlick()
 {
-    m_flickTimer.stop();
+    if (m_flickTimerId != 0) {
+        TouchClock::instance().stop(this, m_flickTimerId);
+        m_flickTimerId = 0;
+    }
     m_autoFlick = false;
 }
 
@@ -195,7 +206,7 @@ void CustomComboBoxView::changeScrollBarValue(int offset)
 
 void CustomComboBoxView::timerEvent(QTimerEvent* event)
 {
-    if (event->timerId() != m_flickTimer.timerId()) {
+    if (m_flickTimerId == 0 || event->timerId() != m_flickTimerId) {
         QListView::timerEvent(event);
         return;
     }

@@ -1,6 +1,5 @@
 #pragma once
 
-#include <QBasicTimer>
 #include <QListView>
 #include <QPersistentModelIndex>
 #include <QPixmap>
@@ -14,6 +13,7 @@ class CustomComboBoxView : public QListView
     Q_OBJECT
 public:
     explicit CustomComboBoxView(QWidget* parent = nullptr);
+    ~CustomComboBoxView() override;
 
     // The row under a finger that may yet become a tap; invalid otherwise.
     QModelIndex pressedIndex() const { return m_pressedIndex; }
@@ -64,7 +64,7 @@ private:
     QPoint m_startPoint;
     QPoint m_endPoint;
     QPoint m_pressPoint;
-    QBasicTimer m_flickTimer;
+    int m_flickTimerId = 0; // 0 is not running
     QPersistentModelIndex m_pressedIndex;
     QPixmap m_separator;
     int m_touchId = -1;

@@ -452,6 +452,11 @@ void KSCombobox::paintEvent(QPaintEvent*)
     }
     painter.setFont(font());
     painter.setPen(enabled ? TEXT_COLOR : DISABLED_COLOR);
+    drawText(painter, area);
+}
+
+void KSCombobox::drawText(QPainter& painter, const QRect& area)
+{
     painter.drawText(area, Qt::AlignLeft | Qt::AlignVCenter | Qt::TextSingleLine,
                      painter.fontMetrics().elidedText(currentText(), Qt::ElideRight, area.width()));
 }

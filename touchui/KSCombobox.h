@@ -70,6 +70,8 @@ protected:
     virtual void adjustPopupListSize();
     virtual void adjustPopupListPostion();
     virtual void drawPopListTranslucent(QWidget* popup);
+    // The text of the closed box that cannot be typed in; painter has font and pen.
+    virtual void drawText(QPainter& painter, const QRect& area);
     // Keys for the list: Escape closes, Return chooses, Up and Down move the cursor.
     virtual bool KeyEventFilter(QObject* obj, QEvent* event);
     virtual bool handlePopupWidgetEvent(QObject* obj, QEvent* event);

@@ -2,6 +2,188 @@
 <!DOCTYPE TS>
 <TS version="2.1" language="zh_CN" sourcelanguage="en">
 <context>
+    <name>ArchiveList</name>
+    <message>
+        <source>Folder</source>
+        <translation>文件夹</translation>
+    </message>
+    <message>
+        <source>File</source>
+        <translation>文件</translation>
+    </message>
+</context>
+<context>
+    <name>ArchiveMenu</name>
+    <message>
+        <source>Create New</source>
+        <translation>新建</translation>
+    </message>
+    <message>
+        <source>Copy</source>
+        <translation>复制</translation>
+    </message>
+    <message>
+        <source>Paste</source>
+        <translation>粘贴</translation>
+    </message>
+    <message>
+        <source>Delete</source>
+        <translation>删除</translation>
+    </message>
+    <message>
+        <source>Save as Template</source>
+        <translation>存为模板</translation>
+    </message>
+</context>
+<context>
+    <name>BoldToolBox</name>
+    <message>
+        <source>Style</source>
+        <translation>样式</translation>
+    </message>
+</context>
+<context>
+    <name>CanvasScene</name>
+    <message>
+        <source>Title goes here</source>
+        <translation>在此输入标题</translation>
+    </message>
+    <message>
+        <source>Text Input</source>
+        <translation>文本输入</translation>
+    </message>
+</context>
+<context>
+    <name>ColorPalette</name>
+    <message>
+        <source>Color Palette</source>
+        <translation>调色板</translation>
+    </message>
+    <message>
+        <source>OK</source>
+        <translation>确定</translation>
+    </message>
+    <message>
+        <source>Cancel</source>
+        <translation>取消</translation>
+    </message>
+</context>
+<context>
+    <name>EdgeSizeSlider</name>
+    <message>
+        <source>px</source>
+        <translation>px</translation>
+    </message>
+</context>
+<context>
+    <name>EdgeToolBox</name>
+    <message>
+        <source>Edge</source>
+        <translation>边缘</translation>
+    </message>
+    <message>
+        <source>px</source>
+        <translation>px</translation>
+    </message>
+</context>
+<context>
+    <name>FamilyToolBox</name>
+    <message>
+        <source>Font</source>
+        <translation>字体</translation>
+    </message>
+</context>
+<context>
+    <name>FolderPicker</name>
+    <message>
+        <source>Untitled</source>
+        <translation>未命名</translation>
+    </message>
+    <message>
+        <source>folder</source>
+        <translation>文件夹</translation>
+    </message>
+    <message>
+        <source>File</source>
+        <translation>文件</translation>
+    </message>
+    <message>
+        <source>Folder Name</source>
+        <translation>文件夹名称</translation>
+    </message>
+    <message>
+        <source>Duplicate</source>
+        <translation>复制</translation>
+    </message>
+    <message>
+        <source>New Folder</source>
+        <translation>新建文件夹</translation>
+    </message>
+    <message>
+        <source>Open</source>
+        <translation>打开</translation>
+    </message>
+    <message>
+        <source>Cancel</source>
+        <translation>取消</translation>
+    </message>
+</context>
+<context>
+    <name>GraphicsText</name>
+    <message>
+        <source>Title goes here</source>
+        <translation>在此输入标题</translation>
+    </message>
+    <message>
+        <source>Text Input</source>
+        <translation>文本输入</translation>
+    </message>
+</context>
+<context>
+    <name>KerningToolBox</name>
+    <message>
+        <source>Space</source>
+        <translation>间距</translation>
+    </message>
+</context>
+<context>
+    <name>RangeOfMoveText</name>
+    <message>
+        <source>Range of move per 1 tap</source>
+        <translation>每次点按的移动距离</translation>
+    </message>
+    <message>
+        <source>2px</source>
+        <translation>2px</translation>
+    </message>
+    <message>
+        <source>10px</source>
+        <translation>10px</translation>
+    </message>
+</context>
+<context>
+    <name>ShadowToolBox</name>
+    <message>
+        <source>Shadow</source>
+        <translation>阴影</translation>
+    </message>
+</context>
+<context>
+    <name>SizeToolBox</name>
+    <message>
+        <source>Size</source>
+        <translation>大小</translation>
+    </message>
+    <message>
+        <source>pt</source>
+        <translation>磅</translation>
+    </message>
+    <message>
+        <source>Font Size</source>
+        <translation>字体大小</translation>
+    </message>
+</context>
+<context>
     <name>TitlerWindow</name>
     <message>
         <source>Titler</source>
@@ -61,97 +243,6 @@
     <message>
         <source>Checker</source>
         <translation>棋盘格</translation>
-    </message>
-</context>
-<context>
-    <name>CanvasScene</name>
-    <message>
-        <source>Title goes here</source>
-        <translation>在此输入标题</translation>
-    </message>
-    <message>
-        <source>Text Input</source>
-        <translation>文本输入</translation>
-    </message>
-</context>
-<context>
-    <name>GraphicsText</name>
-    <message>
-        <source>Title goes here</source>
-        <translation>在此输入标题</translation>
-    </message>
-    <message>
-        <source>Text Input</source>
-        <translation>文本输入</translation>
-    </message>
-</context>
-<context>
-    <name>ArchiveList</name>
-    <message>
-        <source>Folder</source>
-        <translation>文件夹</translation>
-    </message>
-    <message>
-        <source>File</source>
-        <translation>文件</translation>
-    </message>
-</context>
-<context>
-    <name>FolderPicker</name>
-    <message>
-        <source>Untitled</source>
-        <translation>未命名</translation>
-    </message>
-    <message>
-        <source>folder</source>
-        <translation>文件夹</translation>
-    </message>
-    <message>
-        <source>File</source>
-        <translation>文件</translation>
-    </message>
-    <message>
-        <source>Folder Name</source>
-        <translation>文件夹名称</translation>
-    </message>
-    <message>
-        <source>Duplicate</source>
-        <translation>复制</translation>
-    </message>
-    <message>
-        <source>New Folder</source>
-        <translation>新建文件夹</translation>
-    </message>
-    <message>
-        <source>Open</source>
-        <translation>打开</translation>
-    </message>
-    <message>
-        <source>Cancel</source>
-        <translation>取消</translation>
-    </message>
-</context>
-<context>
-    <name>ArchiveMenu</name>
-    <message>
-        <source>Create New</source>
-        <translation>新建</translation>
-    </message>
-    <message>
-        <source>Copy</source>
-        <translation>复制</translation>
-    </message>
-    <message>
-        <source>Paste</source>
-        <translation>粘贴</translation>
-    </message>
-    <message>
-        <source>Delete</source>
-        <translation>删除</translation>
-    </message>
-    <message>
-        <source>Save as Template</source>
-        <translation>存为模板</translation>
     </message>
 </context>
 </TS>

@@ -2,6 +2,188 @@
 <!DOCTYPE TS>
 <TS version="2.1" language="en" sourcelanguage="en">
 <context>
+    <name>ArchiveList</name>
+    <message>
+        <source>Folder</source>
+        <translation>Folder</translation>
+    </message>
+    <message>
+        <source>File</source>
+        <translation>File</translation>
+    </message>
+</context>
+<context>
+    <name>ArchiveMenu</name>
+    <message>
+        <source>Create New</source>
+        <translation>Create New</translation>
+    </message>
+    <message>
+        <source>Copy</source>
+        <translation>Copy</translation>
+    </message>
+    <message>
+        <source>Paste</source>
+        <translation>Paste</translation>
+    </message>
+    <message>
+        <source>Delete</source>
+        <translation>Delete</translation>
+    </message>
+    <message>
+        <source>Save as Template</source>
+        <translation>Save as Template</translation>
+    </message>
+</context>
+<context>
+    <name>BoldToolBox</name>
+    <message>
+        <source>Style</source>
+        <translation>Style</translation>
+    </message>
+</context>
+<context>
+    <name>CanvasScene</name>
+    <message>
+        <source>Title goes here</source>
+        <translation>Title goes here</translation>
+    </message>
+    <message>
+        <source>Text Input</source>
+        <translation>Text Input</translation>
+    </message>
+</context>
+<context>
+    <name>ColorPalette</name>
+    <message>
+        <source>Color Palette</source>
+        <translation>Color Palette</translation>
+    </message>
+    <message>
+        <source>OK</source>
+        <translation>OK</translation>
+    </message>
+    <message>
+        <source>Cancel</source>
+        <translation>Cancel</translation>
+    </message>
+</context>
+<context>
+    <name>EdgeSizeSlider</name>
+    <message>
+        <source>px</source>
+        <translation>px</translation>
+    </message>
+</context>
+<context>
+    <name>EdgeToolBox</name>
+    <message>
+        <source>Edge</source>
+        <translation>Edge</translation>
+    </message>
+    <message>
+        <source>px</source>
+        <translation>px</translation>
+    </message>
+</context>
+<context>
+    <name>FamilyToolBox</name>
+    <message>
+        <source>Font</source>
+        <translation>Font</translation>
+    </message>
+</context>
+<context>
+    <name>FolderPicker</name>
+    <message>
+        <source>Untitled</source>
+        <translation>Untitled</translation>
+    </message>
+    <message>
+        <source>folder</source>
+        <translation>folder</translation>
+    </message>
+    <message>
+        <source>File</source>
+        <translation>File</translation>
+    </message>
+    <message>
+        <source>Folder Name</source>
+        <translation>Folder Name</translation>
+    </message>
+    <message>
+        <source>Duplicate</source>
+        <translation>Duplicate</translation>
+    </message>
+    <message>
+        <source>New Folder</source>
+        <translation>New Folder</translation>
+    </message>
+    <message>
+        <source>Open</source>
+        <translation>Open</translation>
+    </message>
+    <message>
+        <source>Cancel</source>
+        <translation>Cancel</translation>
+    </message>
+</context>
+<context>
+    <name>GraphicsText</name>
+    <message>
+        <source>Title goes here</source>
+        <translation>Title goes here</translation>
+    </message>
+    <message>
+        <source>Text Input</source>
+        <translation>Text Input</translation>
+    </message>
+</context>
+<context>
+    <name>KerningToolBox</name>
+    <message>
+        <source>Space</source>
+        <translation>Space</translation>
+    </message>
+</context>
+<context>
+    <name>RangeOfMoveText</name>
+    <message>
+        <source>Range of move per 1 tap</source>
+        <translation>Range of move per 1 tap</translation>
+    </message>
+    <message>
+        <source>2px</source>
+        <translation>2px</translation>
+    </message>
+    <message>
+        <source>10px</source>
+        <translation>10px</translation>
+    </message>
+</context>
+<context>
+    <name>ShadowToolBox</name>
+    <message>
+        <source>Shadow</source>
+        <translation>Shadow</translation>
+    </message>
+</context>
+<context>
+    <name>SizeToolBox</name>
+    <message>
+        <source>Size</source>
+        <translation>Size</translation>
+    </message>
+    <message>
+        <source>pt</source>
+        <translation>pt</translation>
+    </message>
+    <message>
+        <source>Font Size</source>
+        <translation>Font Size</translation>
+    </message>
+</context>
+<context>
     <name>TitlerWindow</name>
     <message>
         <source>Titler</source>
@@ -61,97 +243,6 @@
     <message>
         <source>Checker</source>
         <translation>Checker</translation>
-    </message>
-</context>
-<context>
-    <name>CanvasScene</name>
-    <message>
-        <source>Title goes here</source>
-        <translation>Title goes here</translation>
-    </message>
-    <message>
-        <source>Text Input</source>
-        <translation>Text Input</translation>
-    </message>
-</context>
-<context>
-    <name>GraphicsText</name>
-    <message>
-        <source>Title goes here</source>
-        <translation>Title goes here</translation>
-    </message>
-    <message>
-        <source>Text Input</source>
-        <translation>Text Input</translation>
-    </message>
-</context>
-<context>
-    <name>ArchiveList</name>
-    <message>
-        <source>Folder</source>
-        <translation>Folder</translation>
-    </message>
-    <message>
-        <source>File</source>
-        <translation>File</translation>
-    </message>
-</context>
-<context>
-    <name>FolderPicker</name>
-    <message>
-        <source>Untitled</source>
-        <translation>Untitled</translation>
-    </message>
-    <message>
-        <source>folder</source>
-        <translation>folder</translation>
-    </message>
-    <message>
-        <source>File</source>
-        <translation>File</translation>
-    </message>
-    <message>
-        <source>Folder Name</source>
-        <translation>Folder Name</translation>
-    </message>
-    <message>
-        <source>Duplicate</source>
-        <translation>Duplicate</translation>
-    </message>
-    <message>
-        <source>New Folder</source>
-        <translation>New Folder</translation>
-    </message>
-    <message>
-        <source>Open</source>
-        <translation>Open</translation>
-    </message>
-    <message>
-        <source>Cancel</source>
-        <translation>Cancel</translation>
-    </message>
-</context>
-<context>
-    <name>ArchiveMenu</name>
-    <message>
-        <source>Create New</source>
-        <translation>Create New</translation>
-    </message>
-    <message>
-        <source>Copy</source>
-        <translation>Copy</translation>
-    </message>
-    <message>
-        <source>Paste</source>
-        <translation>Paste</translation>
-    </message>
-    <message>
-        <source>Delete</source>
-        <translation>Delete</translation>
-    </message>
-    <message>
-        <source>Save as Template</source>
-        <translation>Save as Template</translation>
     </message>
 </context>
 </TS>

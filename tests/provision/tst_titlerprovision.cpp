@@ -1,3 +1,4 @@
+#include "appliance/PresetTemplates.h"
 #include "appliance/SampleBackgrounds.h"
 #include "appliance/SampleTitles.h"
 #include "appliance/TitlerProvision.h"
@@ -170,13 +171,21 @@ void tst_titlerprovision::samplesShowFourScriptsAnOutlineAndAShadow()
 
 void tst_titlerprovision::templatesAreReadInBothLanguages()
 {
-    for (const char* set : {"templates_en", "templates_chs"}) {
+    for (const bool chinese : {false, true}) {
+        const QString set = chinese ? "templates_chs" : "templates_en";
         const auto templates = titlesOf(mBase + "resources/Templates/" + set);
-        QCOMPARE(templates.size(), std::size_t(3));
-        for (const auto& preset : templates) {
-            QVERIFY(preset->isPreset());
-            QCOMPARE(QImage(preset->getFullPathOfBgResource()).size(), QSize(1280, 720));
-            QCOMPARE(QImage(preset->getFullPathOfThumbnailSmall()).size(), QSize(240, 135));
+        const auto samples = PresetTemplates::samples(chinese);
+        QCOMPARE(templates.size(), samples.size());
+        for (std::size_t i = 0; i < samples.size(); ++i) {
+            const Archive& preset = *templates.at(i);
+            QCOMPARE(preset.getName(), samples.at(i).stem);
+            QCOMPARE(preset.text().size(), samples.at(i).archive.text().size());
+            QCOMPARE(preset.isPreset(), bool(samples.at(i).background));
+            QCOMPARE(QImage(preset.getFullPathOfThumbnailSmall()).size(), QSize(240, 135));
+            if (preset.isPreset()) {
+                QCOMPARE(QImage(preset.getFullPathOfBgResource()).size(), QSize(1280, 720));
+                QCOMPARE(QImage(preset.getFullPathOfBgResourceBig()).size(), QSize(1920, 1080));
+            }
         }
     }
 }
@@ -193,6 +202,12 @@ void tst_titlerprovision::aSecondRunKeepsWhatTheUserMade()
     changed.close();
     QVERIFY(QFile::remove(folder + "20240101090000002.xml"));
     QVERIFY(QDir(base + QString::fromUtf8("resources/Titles/天气")).removeRecursively());
+    const QString presets = base + "resources/Templates/templates_en/";
+    QVERIFY(QFile::remove(presets + "Quote.xml"));
+    QFile changedPreset(presets + "Strap.xml");
+    QVERIFY(changedPreset.open(QIODevice::WriteOnly));
+    changedPreset.write("<mine/>");
+    changedPreset.close();
     QVERIFY(QFile::remove(base + "resources/Templates/checker_240x135.png"));
     QMap<QString, QByteArray> expected = tree(base);
 

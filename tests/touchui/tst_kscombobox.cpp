@@ -1,4 +1,5 @@
 // The combo box and its list.
+#include "tests/touchui/ManualClock.h"
 #include "tests/touchui/TouchFixture.h"
 #include "touchui/CustomComboBoxDelegate.h"
 #include "touchui/CustomComboBoxView.h"
@@ -64,6 +65,7 @@ private:
         QVERIFY(QTest::qWaitForWindowExposed(m_box->listView()->window()));
     }
 
+    std::unique_ptr<ManualClock> m_clock;
     std::unique_ptr<TouchFixture> m_touch;
     std::unique_ptr<QWidget> m_window;
     TouchEventButton* m_button = nullptr;
@@ -74,6 +76,7 @@ void TestKSCombobox::init()
 {
     Q_INIT_RESOURCE(UILibrary);
     Q_INIT_RESOURCE(TitlerToolResource);
+    m_clock = std::make_unique<ManualClock>();
     m_touch = std::make_unique<TouchFixture>();
     m_window = std::make_unique<QWidget>();
     m_window->setGeometry(0, 0, 800, 600);
@@ -90,6 +93,7 @@ void TestKSCombobox::cleanup()
 {
     m_window.reset();
     m_touch.reset();
+    m_clock.reset();
 }
 
 void TestKSCombobox::tapOpensAndTapChooses()
@@ -306,14 +310,21 @@ void TestKSCombobox::listFollowsTheFingerAndRunsOn()
     m_touch->press(list(), QPoint(50, 300));
     m_touch->move(list(), QPoint(50, 200));
     QVERIFY(!m_box->listView()->pressedIndex().isValid());
-    QTRY_VERIFY(bar->value() > 80);
-    QVERIFY(bar->value() <= 110);
+    m_clock->advance(33);
+    QCOMPARE(bar->value(), 50); // half of the way at each tick
+    m_clock->advance(33);
+    QCOMPARE(bar->value(), 75);
+    m_clock->advance(330);
+    QVERIFY(bar->value() > 90 && bar->value() <= 105);
     m_touch->move(list(), QPoint(50, 20));
     m_touch->lift(list(), QPoint(50, 20));
     QVERIFY(m_box->listView()->isAutoFilck());
     const int left = bar->value();
-    QTRY_VERIFY(bar->value() > left + 100);
-    QTRY_VERIFY_WITH_TIMEOUT(!m_box->listView()->isAutoFilck(), 10000);
+    m_clock->advance(330);
+    QVERIFY(bar->value() > left + 100);
+    m_clock->advance(10000);
+    QVERIFY(!m_box->listView()->isAutoFilck());
+    QCOMPARE(m_clock->running(), 0);
     QVERIFY(m_box->isPopupVisible());
     QCOMPARE(m_box->currentIndex(), 0);
 }
@@ -326,8 +337,12 @@ void TestKSCombobox::flickIntoTheEndStops()
     m_touch->press(list(), QPoint(50, 400));
     m_touch->move(list(), QPoint(50, 100));
     m_touch->lift(list(), QPoint(50, 20));
-    QTRY_COMPARE(bar->value(), bar->maximum());
-    QTRY_VERIFY(!m_box->listView()->isAutoFilck());
+    for (int tick = 0; bar->value() < bar->maximum() && tick < 100; ++tick) {
+        QVERIFY(m_box->listView()->isAutoFilck());
+        m_clock->advance(33);
+    }
+    QCOMPARE(bar->value(), bar->maximum());
+    QVERIFY(!m_box->listView()->isAutoFilck());
     // It is at rest: the next tap chooses.
     m_touch->tap(list(), rowPoint(13));
     QCOMPARE(m_box->currentIndex(), 13);
@@ -380,7 +395,8 @@ void TestKSCombobox::mouseDragsTheList()
     QScrollBar* bar = m_box->listView()->verticalScrollBar();
     QTest::mousePress(list(), Qt::LeftButton, {}, QPoint(50, 300));
     QTest::mouseMove(list(), QPoint(50, 100));
-    QTRY_VERIFY(bar->value() > 0);
+    m_clock->advance(33);
+    QCOMPARE(bar->value(), 100);
     QTest::mouseRelease(list(), Qt::LeftButton, {}, QPoint(50, 100));
     QVERIFY(m_box->isPopupVisible());
     QCOMPARE(m_box->currentIndex(), 0);

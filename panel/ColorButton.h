@@ -1,0 +1,24 @@
+#pragma once
+
+#include "touchui/KSPushbutton.h"
+
+#include <QColor>
+#include <QString>
+
+// A touch button whose face is a colour: it is painted from its style sheet, darker while it is pressed and
+// faint while it is disabled.
+class ColorButton : public KSPushbutton
+{
+    Q_OBJECT
+public:
+    explicit ColorButton(QWidget* parent);
+
+    // "rgba(<red>, <green>, <blue>, <alpha>)" for a style sheet; a text that is no colour gives black.
+    static QString getRgbaValue(const QString& color);
+
+    // Sets "background-color" to the colour and adds the rest of the declarations.
+    void setFace(const QString& color, const QString& declarations);
+
+protected:
+    void paintEvent(QPaintEvent* event) override;
+};

@@ -1,0 +1,105 @@
+#pragma once
+
+#include <QDialog>
+#include <QList>
+#include <QPixmap>
+#include <QPoint>
+#include <QRect>
+#include <QString>
+
+class ColorButton;
+class KSPushbutton;
+class QLabel;
+class QPainter;
+
+// Thirty colours to choose from, for the text and for its edge. A tap on a colour is previewed at once; OK
+// keeps it, Cancel brings back what was there when the palette opened. A finger on the palette itself moves
+// it within the titler's window. Not modal. GUI thread only.
+class ColorPalette : public QDialog
+{
+    Q_OBJECT
+public:
+    static constexpr int ROW_COUNT = 3;
+    static constexpr int CULUMN_COUNT = 10;
+    static constexpr int PALETTE_WIDTH = 640;
+    static constexpr int PALETTE_HEIGHT = 333;
+    static constexpr int USELESS_VALUE = -1;
+    static constexpr int PALETTE_LABEL_WIDTH = 226;
+    static constexpr int PALETTE_LABEL_HEIGHT = 30;
+    static constexpr int OK_CANCEL_WIDTH = 160;
+    static constexpr int OK_CANCEL_HEIGHT = 48;
+    static constexpr QRect TOPLINE_RECT{QPoint(2, 50), QPoint(637, 53)};
+    static constexpr QRect BOTTOMLINE_RECT{QPoint(2, 262), QPoint(637, 265)};
+    static const QString PALETTE_LABEL_STYLE;
+
+    enum State { PREVIEW = 0, OK = 1, CANCEL = 2 };
+
+    explicit ColorPalette(QWidget* parent);
+
+    // Selects the colour, "#rrggbb", and remembers it for Cancel; one that is not in the table selects
+    // nothing.
+    void setCurrentColor(const QString& color);
+    QString currentColor() const { return m_currentColor; }
+    // Index of the selected button, USELESS_VALUE without one.
+    int currentIndex() const { return m_currentIndex; }
+    const QList<QString>& colors() const { return m_colors; }
+
+    // Hides the palette and takes the mask off the soft keyboard, without an answer.
+    void closePalette();
+
+    // While a mask shows, the palette takes no touches.
+    void showDialogMask(bool show);
+    void showMessageMask(bool show);
+
+    void translateText();
+
+public Q_SLOTS:
+    // Global coordinates.
+    void setTitlerWindowRect(QRect rect) { m_titlerWindowRect = rect; }
+    // Escape is Cancel.
+    void reject() override;
+
+Q_SIGNALS:
+    void sendColorValue(QString color, int state);
+
+protected:
+    bool event(QEvent* event) override;
+    void mousePressEvent(QMouseEvent* event) override;
+    void mouseMoveEvent(QMouseEvent* event) override;
+    void mouseReleaseEvent(QMouseEvent* event) override;
+    void paintEvent(QPaintEvent* event) override;
+    void resizeEvent(QResizeEvent* event) override;
+
+private:
+    void initColorValueList();
+    void createButtons();
+    void createLayout();
+    void select(int index);
+    void styleButton(int index);
+    void colorButtonPressed(int index);
+    void colorButtonReleased(int index);
+    void setColorValue(int index);
+    void okClicked();
+    void cancelClicked();
+    void drawFocusBoundingRect(QPainter& painter) const;
+    void drawHorizontalLine(QPainter& painter, const QRect& line) const;
+    void startDrag(const QPoint& local, const QPoint& global);
+    void drag(const QPoint& global);
+    QWidget* createMask();
+    void showMask(QWidget*& mask, bool show);
+
+    QList<QString> m_colors;
+    QList<ColorButton*> m_buttons;
+    QLabel* m_title = nullptr;
+    KSPushbutton* m_ok = nullptr;
+    KSPushbutton* m_cancel = nullptr;
+    QString m_currentColor;
+    QString m_colorAtOpen;
+    int m_currentIndex = USELESS_VALUE;
+    QRect m_titlerWindowRect;
+    QPoint m_dragOrigin;
+    QString m_pressedObjectName;
+    QPixmap m_background;
+    QWidget* m_dialogMask = nullptr;
+    QWidget* m_messageMask = nullptr;
+};

@@ -1,0 +1,50 @@
+#pragma once
+
+#include "touchui/SliceFrame.h"
+
+#include <QMenu>
+
+class KSSLider;
+class OutsidePressFilter;
+class QLabel;
+
+// The slider for the width of the edge, in a menu of its own that a press beside it closes. It is no popup of
+// Qt's, which would keep touches from the slider.
+class EdgeSizeSlider : public QMenu
+{
+    Q_OBJECT
+public:
+    static constexpr int EDGELABEL_WIDTH = 72;
+    static constexpr int EDGESLIDER_WIDTH = 257;
+    static constexpr int EDGESLIDER_HEIGHT = 57;
+    static constexpr int SLIDER_RANGE_BEGIN = 1;
+    static constexpr int SLIDER_RANGE_END = 10;
+
+    explicit EdgeSizeSlider(QWidget* parent);
+    ~EdgeSizeSlider() override;
+
+    // Kept within the range; reports nothing.
+    void setValue(int value);
+    int value() const;
+    KSSLider* slider() const { return m_slider; }
+    void translateText();
+
+Q_SIGNALS:
+    // The operator moved the slider.
+    void sliderValueSignal(int value);
+
+protected:
+    void paintEvent(QPaintEvent* event) override;
+    void showEvent(QShowEvent* event) override;
+    void hideEvent(QHideEvent* event) override;
+
+private:
+    QWidget* createContent();
+    void drawToolTip();
+    void slotSliderMouseRelease();
+
+    KSSLider* m_slider = nullptr;
+    QLabel* m_endLabel = nullptr;
+    SliceFrame m_frame;
+    OutsidePressFilter* m_outsidePress;
+};

@@ -1,0 +1,52 @@
+#pragma once
+
+#include "panel/ToolBox.h"
+
+class FontCombox;
+
+// The font family of the text.
+class FamilyToolBox : public ToolBox
+{
+    Q_OBJECT
+public:
+    static constexpr int DEFAULT_VALUE = -1;
+    static constexpr int TYPELABEL_WIDTH = 100;
+    static constexpr int WIDGET_HEIGHT = 50;
+    static constexpr int SPACING_BEWTEEN_LABEL_AND_FAMILYCOMBOBOX = 12;
+    static constexpr int FAMILYCOMBOBOX_WIDTH = 214;
+    static constexpr int LAYOUT_SPACING = 0;
+    static constexpr int LAYOUT_MARGIN = 0;
+    static constexpr int SPACING_BEWTEEN_FAMILYCOMBOBOX_AND_COLORBUTTON = 7;
+    static const QString REST_TEXT_STYLE;
+    static const QString DISABLED_TEXT_STYLE;
+
+    explicit FamilyToolBox(QWidget* parent);
+
+    // Shown without a signal; an empty or unknown one shows none.
+    void setFontFamily(const QString& family);
+    // The family shown; empty when none is.
+    QString getFontFamily() const;
+
+    // A font file has arrived in the folder of imported fonts; its name in there.
+    void importFontFamilyNotify(const QString& file);
+    // True offers all families, false the imported ones.
+    void modifyComboxItem(bool isAllItems);
+    void hideComboxList();
+    FontCombox* comboBox() const { return m_box; }
+
+    void setWidgetEnabled() override;
+    void setWidgetDisabled() override;
+    void resetInitializeStyle() override;
+    void translateText() override;
+
+Q_SIGNALS:
+    void familyChange(QString family, int id);
+    void signalShowComboxList(bool shown);
+
+private:
+    void fontFamilyChanged(const QString& family);
+
+    QLabel* m_label = nullptr;
+    FontCombox* m_box = nullptr;
+    bool m_mute = false; // the box is being written from code
+};

@@ -1,0 +1,355 @@
+#include "panel/SizeToolBox.h"
+
+#include "canvas/MessageBoxController.h"
+#include "canvas/TextObjectConstants.h"
+#include "panel/ComboxLineEditRegExpValidator.h"
+#include "panel/SizeBoxLineEdit.h"
+#include "touchui/KSCombobox.h"
+#include "touchui/KSInputContext.h"
+#include "touchui/KSPushbutton.h"
+
+#include <QCoreApplication>
+#include <QHBoxLayout>
+#include <QKeyEvent>
+#include <QLabel>
+#include <QRegularExpression>
+#include <QTouchEvent>
+
+const QString SizeToolBox::REGEXP_VALUE = QStringLiteral("(^[2-9][0-9]{1}$)|(^[1-9][0-9][0-9]$)");
+
+namespace
+{
+
+const char BOX_STYLE[] = "QComboBox {border:0;} QComboBox::drop-down {width:24px;}";
+const char BOX_IMAGES[] = ":/TextToolPanel_TextBox/TextBox_Edittable";
+const char PT_STYLE[] = "QLabel {color:rgb(220, 220, 220); font:20px;}";
+const char PT_DISABLED_STYLE[] = "QLabel {color:rgb(40, 40, 40); font:20px;}";
+constexpr int TEXT_ENABLED = 1;
+constexpr int TEXT_DISABLED = 0;
+// How the field describes itself to the soft keyboard: its kind and title; three parts select all of it.
+constexpr int KEYBOARD_KIND = 1;
+const char SELECT_ALL[] = "2";
+
+} // namespace
+
+SizeToolBox::SizeToolBox(QWidget* parent) : ToolBox(parent)
+{
+    m_label = addLabel(QSize(SIZELABEL_WIDTH, WIDGET_HEIGHT));
+    createBox();
+    m_ptLabel = addLabel(QSize(PTLABEL_WIDTH, WIDGET_HEIGHT), QString::fromLatin1(PT_STYLE),
+                         QString::fromLatin1(PT_DISABLED_STYLE));
+    m_previous = addButton(LeftPiece, QSize(PREVIOUSBTN_WIDTH, WIDGET_HEIGHT), iconPath("Icon_SizeDown"));
+    m_next = addButton(RightPiece, QSize(NEXTBTN_WIDTH, WIDGET_HEIGHT), iconPath("Icon_SizeUp"));
+
+    QHBoxLayout* row = addRow(WIDGET_HEIGHT);
+    row->addWidget(m_label);
+    row->addSpacing(SPACING_BETWEEN_SIZELABEL_AND_COMBOBOX);
+    row->addWidget(m_box);
+    row->addSpacing(SPACING_BETWEEN_COMBOBOX_AND_PTLABEL);
+    row->addWidget(m_ptLabel);
+    row->addSpacing(SPACING_BETWEEN_PTLABEL_AND_NEXTBUTTON);
+    row->addWidget(m_previous);
+    row->addWidget(addSeparator(SWITCHSEPARATOR_WIDTH, WIDGET_HEIGHT));
+    row->addWidget(m_next);
+
+    connect(m_previous, &QAbstractButton::clicked, this, &SizeToolBox::fontSizeToPrevious);
+    connect(m_next, &QAbstractButton::clicked, this, &SizeToolBox::fontSizeToNext);
+    translateText();
+    setFontSize(m_sizes);
+}
+
+void SizeToolBox::createBox()
+{
+    m_box = new KSCombobox(this);
+    m_box->setObjectName(QStringLiteral("SizeBox"));
+    m_box->setFixedSize(COMBOBOX_WIDTH, WIDGET_HEIGHT);
+    m_box->setBackgroundImagesPath(QString::fromLatin1(BOX_IMAGES));
+    m_box->setMaxVisibleItems(COMBOBOX_MAXCOUNT);
+    for (const int size : SizeLadder::comboBoxSizes())
+        m_box->addItem(QString::number(size));
+
+    m_edit = new SizeBoxLineEdit(m_box);
+    m_box->setLineEdit(m_edit);
+    m_box->setStyleSheet(QString::fromLatin1(BOX_STYLE));
+    m_box->setInsertPolicy(QComboBox::NoInsert);
+    m_box->setCompleter(nullptr);
+    auto* validator = new ComboxLineEditRegExpValidator(QRegularExpression(REGEXP_VALUE), m_edit);
+    m_edit->setValidator(validator);
+    m_edit->setReadOnly(true);
+    m_edit->installEventFilter(this);
+    m_box->installEventFilter(this);
+
+    connect(validator, &ComboxLineEditRegExpValidator::validText, this, &SizeToolBox::setValid);
+    connect(m_box, &QComboBox::currentIndexChanged, this,
+            [this](int index) { fontSizeChanged(m_box->itemText(index)); });
+    connect(m_box, &KSCombobox::signalPopupShow, this, [this] { clearFocusOfSizeBoxLineEdit(true); });
+    connect(m_box, &KSCombobox::signalShowComboxList, this, &SizeToolBox::signalShowSizeComboxList);
+    connect(this, &SizeToolBox::setComboxIndex, m_box, &QComboBox::setCurrentIndex);
+    connect(this, &SizeToolBox::validEditingText, this, &SizeToolBox::editSizeFinished);
+}
+
+int SizeToolBox::getFontSize() const
+{
+    return SizeLadder::getMinSize(m_sizes);
+}
+
+void SizeToolBox::hideComboxList()
+{
+    m_box->hidePopup();
+}
+
+// Showing
+
+void SizeToolBox::setFontSize(const QList<int>& sizes)
+{
+    if (sizes.isEmpty())
+        return;
+    m_editMark = false;
+    m_sizes = sizes;
+    showText(SizeLadder::displayText(sizes));
+    updateButtons();
+    Q_EMIT setCurrentSize(getFontSize());
+}
+
+void SizeToolBox::showText(const QString& text)
+{
+    m_ignoreNext = 1;
+    Q_EMIT setComboxIndex(m_box->findData(text, Qt::DisplayRole));
+    if (m_edit->text() != text)
+        m_box->setEditText(text);
+    m_ignoreNext = 0;
+    m_valid = true;
+}
+
+void SizeToolBox::updateButtons()
+{
+    setButtonEnabled(m_previous, isBoxEnabled() && !SizeLadder::allIsMin(m_sizes));
+    setButtonEnabled(m_next, isBoxEnabled() && !SizeLadder::allIsMax(m_sizes));
+}
+
+void SizeToolBox::setWidgetEnabled()
+{
+    ToolBox::setWidgetEnabled();
+    m_box->setEnabled(true);
+    m_edit->setState(TEXT_ENABLED);
+    updateButtons();
+}
+
+void SizeToolBox::setWidgetDisabled()
+{
+    clearFocusOfSizeBoxLineEdit(true);
+    ToolBox::setWidgetDisabled();
+    m_box->setEnabled(false);
+    m_edit->setState(TEXT_DISABLED);
+}
+
+void SizeToolBox::resetInitializeStyle()
+{
+    clearFocusOfSizeBoxLineEdit(true);
+    setFontSize({DEFAULT_SIZE});
+    ToolBox::resetInitializeStyle();
+}
+
+void SizeToolBox::translateText()
+{
+    m_label->setText(tr("Size"));
+    m_ptLabel->setText(tr("pt"));
+    m_edit->setObjectName(
+        QStringLiteral("%1#%2#%3")
+            .arg(QString::number(KEYBOARD_KIND), tr("Font Size"), QString::fromLatin1(SELECT_ALL)));
+}
+
+// List and buttons
+
+void SizeToolBox::fontSizeChanged(const QString& text)
+{
+    if (m_ignoreNext != 0)
+        return;
+    m_editMark = false;
+    bool isNumber = false;
+    const int size = text.toInt(&isNumber);
+    if (isNumber)
+        setAllSizes(size);
+}
+
+void SizeToolBox::setAllSizes(int size)
+{
+    m_sizes.fill(size);
+    showText(SizeLadder::displayText(m_sizes));
+    updateButtons();
+    Q_EMIT sizeChange(m_sizes, TextObjectConstants::PropertySize);
+}
+
+void SizeToolBox::fontSizeToNext()
+{
+    step(&SizeLadder::getNextData);
+}
+
+void SizeToolBox::fontSizeToPrevious()
+{
+    step(&SizeLadder::getPreviousData);
+}
+
+// Each character climbs by itself.
+void SizeToolBox::step(int (*next)(int))
+{
+    clearFocusOfSizeBoxLineEdit(true);
+    for (int& size : m_sizes)
+        size = next(size);
+    showText(SizeLadder::displayText(m_sizes));
+    updateButtons();
+    Q_EMIT sizeChange(m_sizes, TextObjectConstants::PropertySize);
+}
+
+// Typing
+
+bool SizeToolBox::eventFilter(QObject* object, QEvent* event)
+{
+    if (object == m_edit && doLineEditEvent(event))
+        return true;
+    if (object != m_edit && object != m_box)
+        return ToolBox::eventFilter(object, event);
+    switch (static_cast<int>(event->type())) {
+    case QEvent::KeyPress: {
+        const int key = static_cast<QKeyEvent*>(event)->key();
+        if (!m_editMark || (key != Qt::Key_Return && key != Qt::Key_Enter))
+            return false;
+        enterPressed();
+        return true;
+    }
+    case QEvent::FocusOut:
+        editingLeft();
+        return false;
+    case KSInputContext::SoftKeyBoardCloseType:
+        editingLeft();
+        return true;
+    default:
+        return false;
+    }
+}
+
+// A finger on the field is its mouse; one beside it belongs to the box.
+bool SizeToolBox::doLineEditEvent(QEvent* event)
+{
+    switch (event->type()) {
+    case QEvent::TouchBegin:
+        changeTouchEventToMouseEvent(event, QEvent::MouseButtonPress);
+        return true;
+    case QEvent::TouchUpdate:
+        changeTouchEventToMouseEvent(event, QEvent::MouseMove);
+        return true;
+    case QEvent::TouchEnd:
+        changeTouchEventToMouseEvent(event, QEvent::MouseButtonRelease);
+        return true;
+    case QEvent::MouseButtonPress:
+    case QEvent::MouseButtonDblClick:
+        if (!isBoxEnabled())
+            return true;
+        if (m_editMark) {
+            m_edit->selectAll();
+            return true;
+        }
+        setFocusForLineEdit();
+        m_lastValidText = m_edit->text();
+        m_valid = true;
+        m_editMark = true;
+        return false;
+    default:
+        return false;
+    }
+}
+
+void SizeToolBox::changeTouchEventToMouseEvent(QEvent* event, QEvent::Type type)
+{
+    const auto& points = static_cast<QTouchEvent*>(event)->points();
+    if (points.isEmpty())
+        return;
+    const Qt::MouseButton button = type == QEvent::MouseMove ? Qt::NoButton : Qt::LeftButton;
+    const Qt::MouseButtons held = type == QEvent::MouseButtonRelease ? Qt::NoButton : Qt::LeftButton;
+    QMouseEvent mouse(type, points.first().position(), points.first().globalPosition(), button, held,
+                      Qt::NoModifier);
+    QCoreApplication::sendEvent(m_edit, &mouse);
+    event->accept();
+}
+
+void SizeToolBox::setFocusForLineEdit()
+{
+    m_edit->setReadOnly(false);
+    m_edit->setFocus(Qt::MouseFocusReason);
+    KSInputContext::resetFocusWidget();
+}
+
+void SizeToolBox::setValid(bool valid)
+{
+    if (m_ignoreNext != 0)
+        return;
+    m_valid = valid;
+    KSInputContext* input = KSInputContext::instance();
+    if (valid && m_editMark && input)
+        input->showLimitInfo(SubCommonDefine::taLimitInfo());
+}
+
+void SizeToolBox::enterPressed()
+{
+    if (m_valid && m_edit->hasAcceptableInput()) {
+        Q_EMIT validEditingText();
+    } else {
+        resetLastValidTextAndShowWarning();
+        leaveEditing();
+    }
+}
+
+void SizeToolBox::editSizeFinished()
+{
+    const int size = m_edit->text().toInt();
+    showText(QString::number(size)); // or the box would find the row of it by itself, as a change
+    leaveEditing();
+    setAllSizes(size);
+}
+
+// The field was left by another way than Enter: what is not a size is refused aloud, the rest is dropped.
+void SizeToolBox::editingLeft()
+{
+    if (!m_editMark)
+        return;
+    m_editMark = false;
+    if (m_edit->hasAcceptableInput()) {
+        showText(m_lastValidText);
+    } else {
+        resetLastValidTextAndShowWarning();
+    }
+    leaveEditing();
+}
+
+void SizeToolBox::resetLastValidTextAndShowWarning()
+{
+    // The display of a mixed selection was merely left alone.
+    if (m_lastValidText.contains(QLatin1Char('+')) && m_edit->text() == m_lastValidText)
+        return;
+    showText(m_lastValidText);
+    showWarningMessage();
+}
+
+void SizeToolBox::showWarningMessage()
+{
+    if (MessageBoxController* messages = MessageBoxController::getInstance())
+        messages->postMessage(MessageDef::MESSAGE_SIZE_INVALID);
+    m_edit->setReadOnly(true);
+}
+
+void SizeToolBox::clearFocusOfSizeBoxLineEdit(bool clear)
+{
+    if (!clear || !m_editMark)
+        return;
+    showText(m_lastValidText);
+    leaveEditing();
+}
+
+void SizeToolBox::leaveEditing()
+{
+    m_editMark = false;
+    m_edit->deselect();
+    m_edit->setReadOnly(true);
+    m_box->clearFocus(); // which closes the soft keyboard
+    Q_EMIT signalSizeToolBoxEditDone();
+}

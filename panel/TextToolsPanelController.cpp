@@ -1,0 +1,24 @@
+#include "panel/TextToolsPanelController.h"
+
+#include "document/SettingManager.h"
+
+#include <QDebug>
+#include <QFontDatabase>
+
+QStringList TextToolsPanelController::getFontLib() const
+{
+    return QFontDatabase::families(QFontDatabase::Any);
+}
+
+FontStyle TextToolsPanelController::getLastTextStyle() const
+{
+    FontStyle style;
+    if (SettingManager().loadLastTextParameter(&style) == 0)
+        qDebug("read xml file failed");
+    return style;
+}
+
+void TextToolsPanelController::setLastTextStyle(FontStyle style) const
+{
+    SettingManager().saveLastTextParameter(&style);
+}

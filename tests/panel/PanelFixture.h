@@ -1,0 +1,168 @@
+// The property panel in a window of its own under a real finger, with its log and its settings in folders of
+// the test.
+#pragma once
+
+#include "canvas/MessageBoxController.h"
+#include "document/TText.h"
+#include "panel/TextToolsPanel.h"
+#include "support/IPathManagerEx.h"
+#include "support/LogManager.h"
+
+#include <QDir>
+#include <QFile>
+#include <QGuiApplication>
+#include <QPointingDevice>
+#include <QScreen>
+#include <QSignalSpy>
+#include <QTemporaryDir>
+#include <QTest>
+#include <QTouchEvent>
+#include <memory>
+
+class PostedMessages : public MessageBoxController
+{
+public:
+    void setFactory(TitlerToolFactory*) override {}
+    void postMessage(MessageDef::Message_ID id) override { posted.append(int(id)); }
+    void postMessage(MessageDef::Message_ID id, QString) override { posted.append(int(id)); }
+    void postMessage(MessageDef::Message_ID id, MessageDefine::_emBoxType, QString) override
+    {
+        posted.append(int(id));
+    }
+    void setMessageMainWindow(QWidget*) override {}
+    bool GetTitlerIsTop() override { return true; }
+    QMap<QString, QString> getMapData() override { return {}; }
+    void closeMessage(MessageDefine::_emCloseType) override {}
+
+    QList<int> posted;
+};
+
+inline PostedMessages* postedMessages = nullptr;
+
+// Environment of one test program. Make it before anything logs or looks for settings.
+class PanelEnvironment
+{
+public:
+    PanelEnvironment()
+    {
+        Q_INIT_RESOURCE(TitlerToolResource);
+        Q_INIT_RESOURCE(UILibrary);
+        qputenv("K2SYS_AC_DATA", folder.path().toLocal8Bit());
+        qputenv("K2SYS_LOG_DIR", folder.path().toLocal8Bit());
+        QDir(folder.path()).mkpath(QStringLiteral("defaultuser"));
+        QFile paths(folder.filePath(QStringLiteral("defaultuser/PathInfo.xml")));
+        if (paths.open(QIODevice::WriteOnly))
+            paths.write("<?xml version=\"1.0\"?><PathInfo><SystemSetting path=\"settings\"/><Font "
+                        "path=\"fonts\"/></PathInfo>");
+        paths.close();
+        INIT_LOGGING(L"KS2Titler");
+        device.reset(QTest::createTouchDevice());
+        postedMessages = &messages;
+        MessageBoxController::setProvider([]() -> MessageBoxController* { return postedMessages; }, [] {});
+    }
+    ~PanelEnvironment()
+    {
+        MessageBoxController::setProvider(nullptr, nullptr);
+        postedMessages = nullptr;
+        UNINIT_LOGGING();
+        IPathManagerEx::clearUp();
+    }
+
+    // "[area] number: text" of every line of the operation log since the last call.
+    QStringList newLogLines()
+    {
+        QFile file(folder.filePath(QStringLiteral("k2_ope.log")));
+        if (!file.open(QIODevice::ReadOnly) || !file.seek(logPosition))
+            return {};
+        const QStringList lines =
+            QString::fromUtf8(file.readAll()).split(QLatin1Char('\n'), Qt::SkipEmptyParts);
+        logPosition = file.pos();
+        QStringList texts;
+        for (const QString& line : lines) {
+            const qsizetype begin = line.indexOf(QLatin1String("]: ["));
+            texts << line.mid(begin + 3);
+        }
+        return texts;
+    }
+
+    // The screen of the tests is smaller than the appliance's, so the window comes to the finger.
+    void bringOnScreen(QWidget* widget, QPoint point)
+    {
+        const QPoint global = widget->mapToGlobal(point);
+        if (!QGuiApplication::primaryScreen()->geometry().contains(global))
+            widget->window()->move(widget->window()->pos() - global + QPoint(400, 400));
+    }
+    void touch(QWidget* widget, QPoint point)
+    {
+        bringOnScreen(widget, point);
+        QTest::touchEvent(widget, device.get()).press(0, point, widget);
+        QTest::touchEvent(widget, device.get()).release(0, point, widget);
+    }
+    void tap(QWidget* widget) { touch(widget, widget->rect().center()); }
+
+    QTemporaryDir folder;
+    PostedMessages messages;
+    std::unique_ptr<QPointingDevice> device;
+    qint64 logPosition = 0;
+};
+
+// A record with one plain character for each letter.
+inline TText plainText(const QString& letters = QStringLiteral("Abc"))
+{
+    TText text;
+    text.setTextObjectID(1);
+    text.setXValue(100);
+    text.setYValue(200);
+    std::vector<TextStyle*> items;
+    for (const QChar letter : letters) {
+        items.push_back(new TextStyle);
+        items.back()->setText(QString(letter).toStdString());
+        items.back()->setFontSize(64);
+    }
+    text.setTextItems(items);
+    return text;
+}
+
+// What the panel sent last: a copy, since the record lives during the signal only.
+struct SentStyle {
+    TText style;
+    int id = -1;
+    int undoFlag = -1;
+};
+
+// A panel that is enabled, with whatever it sends.
+class Panel
+{
+public:
+    explicit Panel(PanelEnvironment& surroundings) : environment(surroundings)
+    {
+        window.resize(1363, 220);
+        panel = new TextToolsPanel(&window);
+        panel->setGeometry(0, 0, 1363, 209);
+        QObject::connect(panel, &TextToolsPanel::textStyleChange, panel,
+                         [this](TText* style, int id, int undoFlag) {
+                             sent.append({*style, id, undoFlag});
+                         });
+        window.show();
+    }
+    ~Panel() { environment.newLogLines(); }
+
+    // Shows the record as the canvas does for an object that is selected as one.
+    void select(TText text, bool shadowAlign = true, bool move = true)
+    {
+        panel->selectionModeForShadowAndAlign(shadowAlign, move);
+        panel->updateTextStyle(&text);
+        environment.newLogLines();
+    }
+    template <typename Widget>
+    Widget* find(const char* name = nullptr) const
+    {
+        return panel->findChild<Widget*>(name ? QString::fromLatin1(name) : QString());
+    }
+    void tap(const char* button) { environment.tap(find<QWidget>(button)); }
+
+    PanelEnvironment& environment;
+    QWidget window;
+    TextToolsPanel* panel = nullptr; // owned by the window
+    QList<SentStyle> sent;
+};
