@@ -24,6 +24,7 @@ class ArchiveList;
 class CanvasScene;
 class EditContextController;
 class EditTitlerController;
+class FolderPicker;
 class GraphicsView;
 class ISoftKeyBoardController;
 class KSBaseItemWidget;
@@ -93,7 +94,11 @@ public slots:
     // Showing. Requests for a visible window are dropped whole.
     void showTitlerWindow(titler_paramter paramter);
     void refreshArchiveList(QString path);
+    // Modal; return when a folder is open or the operator has cancelled. The second comes from the running
+    // editor, to which Cancel goes back.
     void showFolderDialog();
+    void openFolderDialog();
+    void slotCancelClicked();
     void showTemplateDialog();
 
     // Undo.
@@ -166,6 +171,10 @@ private:
     void connectForTextToolsPanel();
     void connectForUndoRedoCommand();
     void connectForController();
+    void connectForFolderPicker();
+    void connectForFolderNotices();
+    void initFolderPicker();
+    void markOpenFolder();
 
     bool ignoreMouseAndTouchEventWhenArchiveListIsMoveMode(QObject* obj, QEvent* event);
     bool ignoreTouchEventWhenSliderIsShowing(QObject* obj, QEvent* event) const;
@@ -198,6 +207,7 @@ private:
     KSPushbutton* mMoveButton = nullptr;
     QUndoStack mUndoStack;
     QWidget* mOpacityMask = nullptr;
+    FolderPicker* mFolderPicker = nullptr;
     QWidget* mMessageMask = nullptr;
     QWidget* mDialogMask = nullptr;
     QTranslator* mTranslator = nullptr;

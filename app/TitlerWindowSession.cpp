@@ -9,6 +9,7 @@
 #include "canvas/CanvasScene.h"
 #include "document/Archive.h"
 #include "library/ArchiveList.h"
+#include "library/FolderPicker.h"
 #include "panel/TextToolsPanel.h"
 #include "touchui/KSInputContext.h"
 
@@ -43,12 +44,17 @@ void TitlerWindow::showTitlerWindow(titler_paramter paramter)
     mTextToolsPanel->setModuleInfo(m_emModuleInfo);
     mTextToolsPanel->initTextToolsPanel();
 
-    mToolsBar->setFolderButtonEnabled(false); // there is no picker to open
+    mToolsBar->setFolderButtonEnabled(true);
+    initFolderPicker();
     m_bEditByMain = paramter.mode == _titler_paramter::CREATE_OR_EDIT;
     if (paramter.mode == _titler_paramter::CREATE_OR_EDIT) {
+        mToolsBar->setFolderButtonEnabled(false);
+        mFolderPicker->setDuplicateButtonEnabled(false);
+        mFolderPicker->setCreateFolderButtonEnabled(false);
         refreshArchiveList(QString::fromStdWString(paramter.path));
     } else if (paramter.mode == _titler_paramter::SUB_PANEL) {
         EditContextController::getInstance()->setITitlerNoCallBack();
+        mFolderPicker->updateTreeView();
         showFolderDialog();
     }
 
@@ -65,6 +71,7 @@ void TitlerWindow::showTitlerWindow(titler_paramter paramter)
 void TitlerWindow::refreshArchiveList(QString path)
 {
     if (path.isEmpty()) {
+        mFolderPicker->updateTreeView();
         showFolderDialog();
         return;
     }
@@ -77,12 +84,7 @@ void TitlerWindow::refreshArchiveList(QString path)
     } else {
         hide();
     }
-}
-
-// The folder that was last open stands for the operator's choice.
-void TitlerWindow::showFolderDialog()
-{
-    mArchiveList->initArchiveList();
+    markOpenFolder();
 }
 
 // An empty design stands for the operator's choice.
@@ -130,6 +132,7 @@ void TitlerWindow::closeTitlerMainWindow()
     if (m_bRealClose) {
         close();
     } else {
+        mFolderPicker->setCurrentFolderName(QString());
         hide();
         mCanvasScene->clearCanvas();
         mArchiveList->cleanArchiveList();
@@ -176,6 +179,7 @@ void TitlerWindow::endProcess()
     if (m_bEnding)
         return;
     m_bEnding = true;
+    mFolderPicker->done(QDialog::Rejected); // a dialog with no Cancel would refuse the end
     saveCurrentTitle();
     while (!dataSaveIsFinished())
         ::sleep(SAVE_POLL_SECONDS);

@@ -6,6 +6,7 @@
 #include "canvas/CanvasScene.h"
 #include "canvas/GraphicsView.h"
 #include "library/ArchiveList.h"
+#include "library/FolderPicker.h"
 #include "panel/TextToolsPanel.h"
 #include "support/SystemInfo.h"
 #include "touchui/KSPushbutton.h"
@@ -265,6 +266,8 @@ void TitlerWindow::showDialogMaskWidget(bool show)
     setAttribute(Qt::WA_AcceptTouchEvents, !show);
     if (!show || mTextToolsPanel->colorPaletteIsShown())
         mTextToolsPanel->showDialogMaskWidget(show);
+    if (!show || (mFolderPicker->isVisible() && !mTextToolsPanel->colorPaletteIsShown()))
+        mFolderPicker->showDialogMaskWidget(show);
 }
 
 void TitlerWindow::showMessageMaskWidget(bool show)
@@ -282,6 +285,8 @@ void TitlerWindow::showMessageMaskWidget(bool show)
     setAttribute(Qt::WA_AcceptTouchEvents, !show && !isDialogMasked);
     if (!show || mTextToolsPanel->colorPaletteIsShown())
         mTextToolsPanel->showMessageMaskWidget(show);
+    if (!show || (mFolderPicker->isVisible() && !mTextToolsPanel->colorPaletteIsShown()))
+        mFolderPicker->showMessageMaskWidget(show);
 }
 
 void TitlerWindow::slotSystemLanguageChanged(SystemSetupDef::emSystemLanguageType systemLanguage)
@@ -324,6 +329,7 @@ void TitlerWindow::retranslateUI()
     mMoveButton->setText(archiveListIsMoveMode() ? tr("Done") : tr("Move"));
     mTextToolsPanel->translateText();
     mToolsBar->translateText();
+    mFolderPicker->translateText();
     mArchiveList->translateText();
 }
 
@@ -331,6 +337,7 @@ void TitlerWindow::useSpecifiedFont(SystemSetupDef::emSystemLanguageType type)
 {
     const QString family =
         type == SystemSetupDef::emSystemLanguageChinese ? QStringLiteral("DFHeiW5-A") : QStringLiteral("KST");
+    mFolderPicker->setSystemLanFont(QFont(family));
     setStyleSheet(QStringLiteral(" * {font-family:'%1';}").arg(family));
     mArchiveList->setSystemLanFont(family);
 }

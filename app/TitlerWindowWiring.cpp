@@ -24,12 +24,14 @@ void TitlerWindow::connectWidget()
     connectForTextToolsPanel();
     connect(mArchiveList, &ArchiveList::signalStartPasteArchive, this, &TitlerWindow::slotStartPasteArchive);
     connect(this, &TitlerWindow::moveButtonClicked, mArchiveList, &ArchiveList::moveButtonClicked);
+    connectForFolderPicker();
     connectForUndoRedoCommand();
 }
 
 void TitlerWindow::connectForToolsBar()
 {
     connect(mToolsBar, &ToolsBar::closeButtonClick, this, &TitlerWindow::closeTitlerWindow);
+    connect(mToolsBar, &ToolsBar::folderButtonClick, this, &TitlerWindow::openFolderDialog);
     connect(mToolsBar, &ToolsBar::redoButtonClicked, this,
             &TitlerWindow::hideSoftWareWithOutDeleteEmptyItems);
     connect(mToolsBar, &ToolsBar::undoButtonClicked, this,
@@ -147,6 +149,7 @@ void TitlerWindow::connectForController()
             &TitlerWindow::slotHideFontSizeComboxList);
     connect(mEditTitlerController, &EditTitlerController::importNewFontFamilies, mTextToolsPanel,
             &TextToolsPanel::slotImportNewFontFamlies);
+    connectForFolderNotices();
     connect(MessageBoxController::getInstance(), &MessageBoxController::signalCloseMessage, this,
             &TitlerWindow::continueCloseTitler);
     connect(mShowMessageController, &ShowMessageController::signalsShowDialogMaskWidget, this,

@@ -75,7 +75,10 @@ FolderPicker::FolderPicker(QWidget* parent)
 
 FolderPicker::~FolderPicker()
 {
-    // What the tree sends while it goes would reach a dialog that is half gone.
+    // What the editor and the tree send while they go would reach a dialog that is half gone.
+    const QPointer<FolderEditor> editor = mEditor;
+    cancelEdit();
+    delete editor;
     mTree->disconnect(this);
     delete mTree;
 }

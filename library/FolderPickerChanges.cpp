@@ -59,6 +59,8 @@ void FolderPicker::folderNameChanged(FileManagerDefine::tagChangeFolderNameParam
     regetRootPath();
     if (!mCurrentFolderName.isEmpty() && FolderNameRules::isSameName(before, mCurrentFolderName)) {
         mCurrentFolderName = after;
+        // The steps back speak of the old path.
+        emit clearUndoCommandStack();
         emit folderNameChange(folderPath(before), folderPath(after));
     }
     if (!isVisible())
