@@ -35,9 +35,9 @@ public:
     // Folder paths are full paths.
     void editFolderStartStatus(QString folder) override;
     void editFolderEndStatus(QString folder) override;
-    void renameFolderStartStatus(QString folder);
+    void renameFolderStartStatus(QString folder) override;
     void changeTitlerStatus(FileManagerDefine::emTITLECHANGE_TYPE type, QString path) override;
-    void changeTitlerFolderName(QString oldPath, QString newPath);
+    void changeTitlerFolderName(QString oldPath, QString newPath) override;
     void updateTitlerOrder(QString folder) override;
 
     void getClientID(int id) override;

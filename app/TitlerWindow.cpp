@@ -17,6 +17,7 @@
 #include "canvas/DrawBoundingRectangle.h"
 #include "canvas/GraphicsView.h"
 #include "library/ArchiveList.h"
+#include "library/FolderPicker.h"
 #include "library/TemplatePicker.h"
 #include "library/ThumbnailRender.h"
 #include "messaging/services/ISoftKeyBoardController.h"
@@ -116,6 +117,7 @@ TitlerWindow::~TitlerWindow()
 {
     // The canvas must be gone before the service links that its workers report through.
     mUndoStack.clear();
+    delete mFolderPicker;
     delete mTextToolsPanel;
     KSToolTip::clearInstance();
     KSToolTip::s_mainWindow = nullptr;
@@ -276,6 +278,7 @@ void TitlerWindow::initChildWindows()
     mOpacityMask->setGeometry(rect());
     mOpacityMask->raise();
     mOpacityMask->hide();
+    mFolderPicker = new FolderPicker(this);
     mTemplatePicker = new TemplatePicker(this);
 }
 

@@ -24,6 +24,7 @@ class ArchiveList;
 class CanvasScene;
 class EditContextController;
 class EditTitlerController;
+class FolderPicker;
 class GraphicsView;
 class ISoftKeyBoardController;
 class KSBaseItemWidget;
@@ -94,7 +95,11 @@ public slots:
     // Showing. Requests for a visible window are dropped whole.
     void showTitlerWindow(titler_paramter paramter);
     void refreshArchiveList(QString path);
+    // Modal; return when a folder is open or the operator has cancelled. The second comes from the running
+    // editor, to which Cancel goes back.
     void showFolderDialog();
+    void openFolderDialog();
+    void slotCancelClicked();
     // Modal; return when the operator has chosen a template or cancelled. The second begins with the
     // operator's own templates.
     void showTemplateDialog();
@@ -173,6 +178,10 @@ private:
     void connectForController();
     void connectForTemplates();
     void connectForTemplateNotices();
+    void connectForFolderPicker();
+    void connectForFolderNotices();
+    void initFolderPicker();
+    void markOpenFolder();
 
     bool ignoreMouseAndTouchEventWhenArchiveListIsMoveMode(QObject* obj, QEvent* event);
     bool ignoreTouchEventWhenSliderIsShowing(QObject* obj, QEvent* event) const;
@@ -206,6 +215,7 @@ private:
     KSPushbutton* mMoveButton = nullptr;
     QUndoStack mUndoStack;
     QWidget* mOpacityMask = nullptr;
+    FolderPicker* mFolderPicker = nullptr;
     TemplatePicker* mTemplatePicker = nullptr;
     QWidget* mMessageMask = nullptr;
     QWidget* mDialogMask = nullptr;

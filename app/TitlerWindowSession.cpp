@@ -8,6 +8,7 @@
 #include "app/ToolsBar.h"
 #include "canvas/CanvasScene.h"
 #include "library/ArchiveList.h"
+#include "library/FolderPicker.h"
 #include "library/TemplatePicker.h"
 #include "panel/TextToolsPanel.h"
 #include "touchui/KSInputContext.h"
@@ -44,12 +45,17 @@ void TitlerWindow::showTitlerWindow(titler_paramter paramter)
     mTextToolsPanel->initTextToolsPanel();
     mTemplatePicker->setModuleInfo(m_emModuleInfo);
 
-    mToolsBar->setFolderButtonEnabled(false); // there is no picker to open
+    mToolsBar->setFolderButtonEnabled(true);
+    initFolderPicker();
     m_bEditByMain = paramter.mode == _titler_paramter::CREATE_OR_EDIT;
     if (paramter.mode == _titler_paramter::CREATE_OR_EDIT) {
+        mToolsBar->setFolderButtonEnabled(false);
+        mFolderPicker->setDuplicateButtonEnabled(false);
+        mFolderPicker->setCreateFolderButtonEnabled(false);
         refreshArchiveList(QString::fromStdWString(paramter.path));
     } else if (paramter.mode == _titler_paramter::SUB_PANEL) {
         EditContextController::getInstance()->setITitlerNoCallBack();
+        mFolderPicker->updateTreeView();
         showFolderDialog();
     }
 
@@ -66,6 +72,7 @@ void TitlerWindow::showTitlerWindow(titler_paramter paramter)
 void TitlerWindow::refreshArchiveList(QString path)
 {
     if (path.isEmpty()) {
+        mFolderPicker->updateTreeView();
         showFolderDialog();
         return;
     }
@@ -78,12 +85,7 @@ void TitlerWindow::refreshArchiveList(QString path)
     } else {
         hide();
     }
-}
-
-// The folder that was last open stands for the operator's choice.
-void TitlerWindow::showFolderDialog()
-{
-    mArchiveList->initArchiveList();
+    markOpenFolder();
 }
 
 void TitlerWindow::closeTitlerWindow()
@@ -127,6 +129,7 @@ void TitlerWindow::closeTitlerMainWindow()
         close();
     } else {
         mTemplatePicker->reject(); // an answered message may come while it is open
+        mFolderPicker->setCurrentFolderName(QString());
         hide();
         mCanvasScene->clearCanvas();
         mArchiveList->cleanArchiveList();
@@ -173,6 +176,7 @@ void TitlerWindow::endProcess()
     if (m_bEnding)
         return;
     m_bEnding = true;
+    mFolderPicker->done(QDialog::Rejected); // a dialog with no Cancel would refuse the end
     saveCurrentTitle();
     while (!dataSaveIsFinished())
         ::sleep(SAVE_POLL_SECONDS);

@@ -5,6 +5,7 @@
 #include "app/EditTitlerController.h"
 #include "canvas/CanvasScene.h"
 #include "library/ArchiveList.h"
+#include "library/FolderPicker.h"
 #include "library/TemplatePicker.h"
 
 #include <QCoreApplication>
@@ -44,6 +45,8 @@ void TitlerWindow::connectForTemplates()
 {
     connect(mTemplatePicker, &TemplatePicker::selectedTemplate, this,
             &TitlerWindow::slotStartCreateNewArchiveFromTemplate);
+    connect(mTemplatePicker, &TemplatePicker::signalCloseSoftwareKeyBoardForFileManager, mFolderPicker,
+            &FolderPicker::slotCloseSoftwareKeyBoardForFileManager);
     connect(mArchiveList, &ArchiveList::addUserSignal, mTemplatePicker, &TemplatePicker::slotSaveAsTemplate);
 }
 
@@ -63,6 +66,9 @@ void TitlerWindow::showTemplateDialog()
         return;
     APPEventFilterUnlock();
     setOpacityMaskVisible(true);
+    const bool isOverFolderPicker = mFolderPicker->isVisible();
+    if (isOverFolderPicker)
+        mFolderPicker->showOpacityWidget(true);
     mTemplatePicker->setModal(true);
     mTemplatePicker->raise();
     mTemplatePicker->activateWindow();
@@ -72,7 +78,14 @@ void TitlerWindow::showTemplateDialog()
     mTemplatePicker->exec();
     QEvent ends(templateDialogEnds());
     QCoreApplication::sendEvent(this, &ends);
-    setOpacityMaskVisible(false);
+    if (!isOverFolderPicker) {
+        setOpacityMaskVisible(false);
+        return;
+    }
+    mFolderPicker->showOpacityWidget(false);
+    // Without a template the operator is back in the folder picker, which stays open over the darkened window.
+    if (!mTemplatePicker->isSelectedItem())
+        mFolderPicker->setKeepFolderDialog();
 }
 
 void TitlerWindow::showTemplateDialogOnUser()

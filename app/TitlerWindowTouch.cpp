@@ -6,6 +6,7 @@
 #include "canvas/CanvasScene.h"
 #include "canvas/GraphicsView.h"
 #include "library/ArchiveList.h"
+#include "library/FolderPicker.h"
 #include "library/TemplatePicker.h"
 #include "panel/TextToolsPanel.h"
 #include "support/SystemInfo.h"
@@ -270,6 +271,9 @@ void TitlerWindow::showDialogMaskWidget(bool show)
         mTextToolsPanel->showDialogMaskWidget(show);
     if (!show || (mTemplatePicker->isVisible() && !mTextToolsPanel->colorPaletteIsShown()))
         mTemplatePicker->showDialogMaskWidget(show);
+    if (!show || (mFolderPicker->isVisible() && !mTemplatePicker->isVisible() &&
+                  !mTextToolsPanel->colorPaletteIsShown()))
+        mFolderPicker->showDialogMaskWidget(show);
 }
 
 void TitlerWindow::showMessageMaskWidget(bool show)
@@ -289,6 +293,9 @@ void TitlerWindow::showMessageMaskWidget(bool show)
         mTextToolsPanel->showMessageMaskWidget(show);
     if (!show || (mTemplatePicker->isVisible() && !mTextToolsPanel->colorPaletteIsShown()))
         mTemplatePicker->showMessageMaskWidget(show);
+    if (!show || (mFolderPicker->isVisible() && !mTemplatePicker->isVisible() &&
+                  !mTextToolsPanel->colorPaletteIsShown()))
+        mFolderPicker->showMessageMaskWidget(show);
 }
 
 void TitlerWindow::slotSystemLanguageChanged(SystemSetupDef::emSystemLanguageType systemLanguage)
@@ -333,6 +340,7 @@ void TitlerWindow::retranslateUI()
     mMoveButton->setText(archiveListIsMoveMode() ? tr("Done") : tr("Move"));
     mTextToolsPanel->translateText();
     mToolsBar->translateText();
+    mFolderPicker->translateText();
     mArchiveList->translateText();
     mTemplatePicker->translateText();
 }
@@ -341,6 +349,7 @@ void TitlerWindow::useSpecifiedFont(SystemSetupDef::emSystemLanguageType type)
 {
     const QString family =
         type == SystemSetupDef::emSystemLanguageChinese ? QStringLiteral("DFHeiW5-A") : QStringLiteral("KST");
+    mFolderPicker->setSystemLanFont(QFont(family));
     setStyleSheet(QStringLiteral(" * {font-family:'%1';}").arg(family));
     mArchiveList->setSystemLanFont(family);
     mTemplatePicker->setSystemLanFont(QFont(family));

@@ -25,12 +25,14 @@ void TitlerWindow::connectWidget()
     connect(mArchiveList, &ArchiveList::signalStartPasteArchive, this, &TitlerWindow::slotStartPasteArchive);
     connect(this, &TitlerWindow::moveButtonClicked, mArchiveList, &ArchiveList::moveButtonClicked);
     connectForTemplates();
+    connectForFolderPicker();
     connectForUndoRedoCommand();
 }
 
 void TitlerWindow::connectForToolsBar()
 {
     connect(mToolsBar, &ToolsBar::closeButtonClick, this, &TitlerWindow::closeTitlerWindow);
+    connect(mToolsBar, &ToolsBar::folderButtonClick, this, &TitlerWindow::openFolderDialog);
     connect(mToolsBar, &ToolsBar::redoButtonClicked, this,
             &TitlerWindow::hideSoftWareWithOutDeleteEmptyItems);
     connect(mToolsBar, &ToolsBar::undoButtonClicked, this,
@@ -149,6 +151,7 @@ void TitlerWindow::connectForController()
             &TitlerWindow::slotHideFontSizeComboxList);
     connect(mEditTitlerController, &EditTitlerController::importNewFontFamilies, mTextToolsPanel,
             &TextToolsPanel::slotImportNewFontFamlies);
+    connectForFolderNotices();
     connect(MessageBoxController::getInstance(), &MessageBoxController::signalCloseMessage, this,
             &TitlerWindow::continueCloseTitler);
     connect(mShowMessageController, &ShowMessageController::signalsShowDialogMaskWidget, this,

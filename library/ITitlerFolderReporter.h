@@ -1,4 +1,4 @@
-// Tells the file manager which title folder is being edited. The application implements it.
+// Tells the file manager which title folder is being edited or renamed. The application implements it.
 #pragma once
 
 #include <QString>
@@ -13,6 +13,11 @@ public:
     virtual void editFolderEndStatus(QString folder) = 0;
     // The order of the folder's titles has changed without a title coming or going.
     virtual void updateTitlerOrder(QString folder) = 0;
+
+    // The operator has begun to rename the folder.
+    virtual void renameFolderStartStatus(QString folder) = 0;
+    // How that ended; both are the same when the folder kept its name.
+    virtual void changeTitlerFolderName(QString oldPath, QString newPath) = 0;
 
     // The one reporter, not owned; null reports nothing. GUI thread.
     static ITitlerFolderReporter* instance() { return sInstance; }

@@ -72,12 +72,12 @@ int KSTreeModel::createTreeItemChildren(KSModelItem* item)
 }
 
 // Rows that were put in by hand have no source and so no children there.
-void KSTreeModel::fillChildren(KSModelItem* item)
+std::vector<std::unique_ptr<KSModelItem>> KSTreeModel::makeChildren(KSModelItem* item)
 {
-    item->dataItem()->setChildrenCreated(true);
+    std::vector<std::unique_ptr<KSModelItem>> children;
     void* source = item->dataItem()->getSourceData();
     if (m_factory == nullptr || (source == nullptr && item != m_root.get())) {
-        return;
+        return children;
     }
     const bool checked = item->attributes()->getAttribute(Qt::CheckStateRole, 0).toInt() == Qt::Checked;
     for (void* node = m_factory->getChildNode(source); node != nullptr; node = m_factory->getNextNode(node)) {
@@ -87,10 +87,44 @@ void KSTreeModel::fillChildren(KSModelItem* item)
         if (checked) {
             child->attributes()->setAttribute(Qt::CheckStateRole, static_cast<int>(Qt::Checked), 0);
         }
+        children.push_back(std::move(child));
+    }
+    return children;
+}
+
+void KSTreeModel::fillChildren(KSModelItem* item)
+{
+    item->dataItem()->setChildrenCreated(true);
+    for (auto& child : makeChildren(item)) {
         item->addChild(std::move(child));
     }
     if (m_sortColumn >= 0) {
         sortChildren(item, false);
+    }
+}
+
+void KSTreeModel::setSourceData(const QModelIndex& index, void* source)
+{
+    KSModelItem* item = itemOf(index);
+    if (item == nullptr) {
+        return;
+    }
+    const QModelIndex first = index.siblingAtColumn(0);
+    if (item->childCount() > 0) {
+        removeRows(0, item->childCount(), first);
+    }
+    item->dataItem()->setSourceData(source);
+    item->dataItem()->setChildrenCreated(true);
+    auto children = makeChildren(item);
+    if (!children.empty()) {
+        beginInsertRows(first, 0, static_cast<int>(children.size()) - 1);
+        for (auto& child : children) {
+            item->addChild(std::move(child));
+        }
+        if (m_sortColumn >= 0) {
+            sortChildren(item, false);
+        }
+        endInsertRows();
     }
 }
 

@@ -7,6 +7,7 @@
 #include <QAbstractItemModel>
 #include <QMap>
 #include <memory>
+#include <vector>
 
 // A tree without a schema: every cell is a bag of attributes by role, filled by a KSModelDataFactory. The
 // children of a row are made when they are first asked for; whether there are any is known without making
@@ -29,6 +30,10 @@ public:
     void createDataItems();
     // Makes the children of the item unless they are there; the number of children.
     int createTreeItemChildren(KSModelItem* item);
+
+    // Lets the row stand for another node of the source, and makes its children anew from that. Its own
+    // attributes stay.
+    void setSourceData(const QModelIndex& index, void* source);
 
     // The item whose children are the top rows; the root at first.
     KSModelItem* currentRoot() const { return m_currentRoot; }
@@ -99,6 +104,7 @@ private:
     void installDefaultAttributes();
     void createRoot();
     void fillChildren(KSModelItem* item);
+    std::vector<std::unique_ptr<KSModelItem>> makeChildren(KSModelItem* item);
     void sortChildren(KSModelItem* item, bool deep);
     KSModelItem* itemOrRoot(const QModelIndex& index) const;
     bool isOwnIndex(const QModelIndex& index) const;

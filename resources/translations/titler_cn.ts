@@ -127,6 +127,28 @@
         <source>folder</source>
         <translation>文件夹</translation>
     </message>
+    <message>
+        <source>Select Folder</source>
+        <translation>选择文件夹</translation>
+    </message>
+    <message>
+        <source>Name</source>
+        <translation>名称</translation>
+    </message>
+    <message>
+        <source>Date</source>
+        <translation>日期</translation>
+    </message>
+    <message>
+        <source>The following characters cannot be entered.
+\ / : , ; * ? &quot; &lt; &gt; | [ ] = .</source>
+        <translation>不能输入以下字符。
+\ / : , ; * ? &quot; &lt; &gt; | [ ] = .</translation>
+    </message>
+    <message>
+        <source>You can only enter up to 20 characters.</source>
+        <translation>最多只能输入 20 个字符。</translation>
+    </message>
 </context>
 <context>
     <name>GraphicsText</name>

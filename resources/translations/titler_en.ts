@@ -127,6 +127,28 @@
         <source>folder</source>
         <translation>folder</translation>
     </message>
+    <message>
+        <source>Select Folder</source>
+        <translation>Select Folder</translation>
+    </message>
+    <message>
+        <source>Name</source>
+        <translation>Name</translation>
+    </message>
+    <message>
+        <source>Date</source>
+        <translation>Date</translation>
+    </message>
+    <message>
+        <source>The following characters cannot be entered.
+\ / : , ; * ? &quot; &lt; &gt; | [ ] = .</source>
+        <translation>The following characters cannot be entered.
+\ / : , ; * ? &quot; &lt; &gt; | [ ] = .</translation>
+    </message>
+    <message>
+        <source>You can only enter up to 20 characters.</source>
+        <translation>You can only enter up to 20 characters.</translation>
+    </message>
 </context>
 <context>
     <name>GraphicsText</name>

@@ -42,6 +42,10 @@ TEMPLATE_STEP = (258, 153)
 TEMPLATE_COLUMNS = 4
 TEMPLATE_TABS = {"Preset": (356, 216), "User": (475, 216)}
 TEMPLATE_BUTTONS = {"Select": (1285, 907), "Cancel": (1514, 907), "Delete": (1491, 829)}
+# The folder picker: the middle of its first row and of its buttons.
+PICKER_ROW = (800, 306)
+PICKER_ROW_HEIGHT = 48
+PICKER_BUTTONS = {"Duplicate": (513, 857), "New Folder": (681, 857), "Open": (1247, 857), "Cancel": (1415, 857)}
 PICTURES = {"_1920.png": (1920, 1080), "_960.png": (960, 540), "_240.png": (240, 135), "_240S.png": (240, 135)}
 
 
@@ -237,6 +241,30 @@ class TitlerTest(unittest.TestCase):
 
     def click_tool(self, name):
         self.click(*TOOL_POINTS[name])
+
+    def folders(self):
+        """The names of the title folders in the order of the folder picker."""
+        root = os.path.dirname(self.folder())
+        return sorted((name for name in os.listdir(root) if os.path.isdir(os.path.join(root, name))), key=str.lower)
+
+    def open_picker(self):
+        self.click_tool("Folder")
+        self.display.wait_until_still()
+
+    def click_folder(self, name):
+        """Clicks at a folder's row in the picker, in which no folder is open and nothing is scrolled."""
+        x, y = PICKER_ROW
+        self.click(x, y + PICKER_ROW_HEIGHT * self.folders().index(name))
+        self.display.wait_until_still()
+
+    def click_picker(self, button):
+        self.click(*PICKER_BUTTONS[button])
+        self.display.wait_until_still()
+
+    def choose_folder(self, name):
+        """Opens a folder in the folder picker, which shows."""
+        self.click_folder(name)
+        self.click_picker("Open")
 
     def close_window(self):
         start = self.appliance.mark()

@@ -9,24 +9,25 @@ CALL_TYPE = 7
 
 
 class CreateTitles(harness.TitlerTest):
-    def open_for_creation(self, folder):
-        """Asks for new titles; the folder that was open last stands for the operator's choice."""
-        self.open_title(self.titles(folder)[0])
-        self.close_window()
+    def open_for_creation(self, folder, template=1):
+        """Asks for new titles and chooses the folder and the template of the first new title."""
         self.command("register")
         self.command(f"create {CALL_TYPE}")
         self.wait_shown()
+        count = len(self.titles(folder))
+        self.choose_folder(os.path.basename(folder))
+        self.choose_template(template)
+        self.wait_titles(folder, count + 1)
+        self.display.wait_until_still()
 
     def test_new_titles_come_back_in_the_order_of_the_folder(self):
         folder = self.folder(FOLDER)
         old = [title.path for title in self.titles(folder)]
-        self.open_for_creation(folder)
         start = self.appliance.mark()
+        self.open_for_creation(folder)
         # The second is made above the first, so the folder's order is not the order of making.
-        for row in (1, 0):
-            count = len(self.titles(folder))
-            self.create_in_list(row, template=row)
-            self.wait_titles(folder, count + 1)
+        self.create_in_list(0, template=0)
+        self.wait_titles(folder, len(old) + 2)
         self.close_window()
 
         result = self.wait_result(start)
@@ -65,27 +66,36 @@ class CreateTitles(harness.TitlerTest):
         self.close_window()
         self.assertEqual([title.path for title in self.titles(folder)], old)
 
-    def test_a_session_in_which_nothing_was_made_is_answered_too(self):
-        folder = self.folder(FOLDER)
-        self.open_for_creation(folder)
+    def test_no_folder_is_chosen(self):
+        before = {name: self.titles(self.folder(name)) for name in self.folders()}
+        self.command("register")
         start = self.appliance.mark()
+        self.command(f"create {CALL_TYPE}")
+        self.wait_shown()
+        self.click_picker("Cancel")
+        self.wait_closed(start)
+        self.assertEqual(self.results(start), [])
+        self.assertEqual(self.calls("FileManagerController", "titlerEditStatus", start), [])
+        self.assertEqual({name: len(self.titles(self.folder(name))) for name in self.folders()},
+                         {name: len(titles) for name, titles in before.items()})
+        # The next request is a session of its own.
+        first = self.titles(self.folder())[0]
+        self.open_title(first)
         self.close_window()
-        result = self.wait_result(start)
-        self.assertEqual((result["type"], result["path"]), (CALL_TYPE, folder))
-        self.assertEqual((result["count"], result["size"], result["paths"]), (0, 0, []))
+        self.assertEqual(self.results(start), [])
 
     def test_a_title_that_was_deleted_again_is_not_named(self):
         folder = self.folder(FOLDER)
         old = [title.path for title in self.titles(folder)]
-        self.open_for_creation(folder)
         start = self.appliance.mark()
-        self.create_in_list(1)
-        self.wait_titles(folder, 3)
+        self.open_for_creation(folder)
         self.choose_in_list_menu(2, "Delete")
         self.wait_titles(folder, 2)
         self.close_window()
+        # The session is answered nevertheless.
         result = self.wait_result(start)
-        self.assertEqual(result["paths"], [])
+        self.assertEqual((result["type"], result["path"]), (CALL_TYPE, folder))
+        self.assertEqual((result["count"], result["size"], result["paths"]), (0, 0, []))
         self.assertEqual([title.path for title in self.titles(folder)], old)
 
     def wait_result(self, start):

@@ -62,6 +62,21 @@ class Requests(harness.TitlerTest):
         self.command("register")
         self.command("sub")
         self.wait_shown()
+        self.choose_folder("Welcome")
+        first = self.titles(self.folder())[0]
+        self.assert_canvas_shows(first, mean=1.0, visible=0.01)
+        # Cancel goes back to the editor; another folder replaces this one.
+        self.open_picker()
+        self.click_picker("Cancel")
+        self.assert_canvas_shows(first, mean=1.0, visible=0.01)
+        self.open_picker()
+        self.choose_folder("天气")
+        paths = [call["path"] for call in self.calls("FileManagerController", "titlerEditStatus", start)]
+        self.assertEqual(paths, [self.folder(), self.folder("天气")])
+        ends = [call["path"] for call in self.calls("FileManagerController", "titlerEditEndStatus", start)]
+        self.assertEqual(ends, [self.folder()])
+        with self.assertRaises(AssertionError):
+            self.assert_canvas_shows(first, mean=1.0, visible=0.01)
         self.close_window()
         self.assertEqual(self.results(start), [])
         self.assertEqual(self.posted_messages(start), [])

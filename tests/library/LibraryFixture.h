@@ -199,6 +199,13 @@ public:
     void editFolderEndStatus(QString folder) override { note(QStringLiteral("end"), folder); }
     void updateTitlerOrder(QString folder) override { note(QStringLiteral("order"), folder); }
 
+    void renameFolderStartStatus(QString folder) override { note(QStringLiteral("rename"), folder); }
+    void changeTitlerFolderName(QString oldPath, QString newPath) override
+    {
+        mReports.append(QStringLiteral("renamed ") + QFileInfo(oldPath).fileName() + QStringLiteral(" to ") +
+                        QFileInfo(newPath).fileName());
+    }
+
     QStringList take() { return std::exchange(mReports, {}); }
 
 private:

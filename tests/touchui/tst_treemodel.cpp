@@ -33,6 +33,7 @@ private Q_SLOTS:
     void moveRowsKeepsPersistentIndices_data();
     void moveRowsKeepsPersistentIndices();
     void columns();
+    void rowTakesAnotherSource();
     void currentRoot();
     void sortTable_data();
     void sortTable();
@@ -398,6 +399,31 @@ void TestTreeModel::columns()
     QVERIFY(!name.isValid());
     QCOMPARE(model.index(0, 0, model.index(0, 0)).data().toString(), QStringLiteral("2024-01-01"));
     QCOMPARE(model.headerData(0, Qt::Horizontal).toString(), QStringLiteral("Date"));
+}
+
+void TestTreeModel::rowTakesAnotherSource()
+{
+    TreeSource source;
+    source.fill(2, 3);
+    SourceNode* other = source.add(QStringLiteral("Other"), nullptr, true);
+    source.add(QStringLiteral("Only"), other, false);
+    KSTreeModel model(&source, 3);
+    model.createDataItems();
+    QAbstractItemModelTester tester(&model, QAbstractItemModelTester::FailureReportingMode::QtTest);
+    const QModelIndex folder = model.index(0, 0);
+    const QPersistentModelIndex title = model.index(2, 0, folder);
+    model.setSourceData(folder, other);
+    QVERIFY(!title.isValid());
+    QCOMPARE(names(model, folder), QStringList({"Only"}));
+    QCOMPARE(folder.data().toString(), QStringLiteral("Folder 000"));
+    model.setSourceData(folder, nullptr);
+    QCOMPARE(model.rowCount(folder), 0);
+    QVERIFY(!model.hasChildren(folder));
+    QVERIFY(model.insertRow(3));
+    model.setSourceData(model.index(3, 0), other);
+    QCOMPARE(names(model, model.index(3, 0)), QStringList({"Only"}));
+    model.setSourceData(QModelIndex(), other);
+    QCOMPARE(model.rowCount(), 4);
 }
 
 void TestTreeModel::currentRoot()

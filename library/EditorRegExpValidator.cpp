@@ -1,0 +1,20 @@
+#include "library/EditorRegExpValidator.h"
+
+#include "library/FolderNameRules.h"
+
+EditorRegExpValidator::EditorRegExpValidator(const QString& pattern, QObject* parent)
+    : QRegularExpressionValidator(QRegularExpression(pattern), parent)
+{
+}
+
+QValidator::State EditorRegExpValidator::validate(QString& input, int& position) const
+{
+    const State state = QRegularExpressionValidator::validate(input, position);
+    if (FolderNameRules::isTooLong(input))
+        emit longText();
+    else if (state == Invalid)
+        emit invalidText();
+    else
+        emit validText();
+    return state;
+}

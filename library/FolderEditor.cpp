@@ -1,0 +1,155 @@
+#include "library/FolderEditor.h"
+
+#include "library/EditorRegExpValidator.h"
+#include "library/FolderNameRules.h"
+#include "touchui/KSInputContext.h"
+#include "touchui/NineSlice.h"
+
+#include <QEventPoint>
+#include <QKeyEvent>
+#include <QMouseEvent>
+#include <QPainter>
+#include <QTouchEvent>
+
+const QString FolderEditor::FOLDER_PICKER_REGEXP = FolderNameRules::PATTERN;
+const QString FolderEditor::LEFT_IMAGE = QStringLiteral(":/TextToolPanel_TextBox/TextBox_Edittable_Left");
+const QString FolderEditor::CENTER_IMAGE = QStringLiteral(":/TextToolPanel_TextBox/TextBox_Edittable_Center");
+const QString FolderEditor::RIGHT_IMAGE = QStringLiteral(":/TextToolPanel_TextBox/TextBox_Edittable_Right");
+
+namespace
+{
+
+const int FONT_SIZE = 24;
+const int TEXT_MARGIN = 6;
+
+} // namespace
+
+FolderEditor::FolderEditor(QWidget* parent)
+    : QLineEdit(parent), mLeft(LEFT_IMAGE), mCenter(CENTER_IMAGE), mRight(RIGHT_IMAGE)
+{
+    setFocusPolicy(Qt::StrongFocus);
+    setContextMenuPolicy(Qt::NoContextMenu);
+    setAttribute(Qt::WA_AcceptTouchEvents); // else the list behind takes the finger for its own
+    setFrame(false);
+    QFont nameFont = font();
+    nameFont.setPixelSize(FONT_SIZE);
+    setFont(nameFont);
+    setStyleSheet(
+        QStringLiteral("background: transparent; border: 0px; font-size: %1px; color: rgb(220, 220, 220);"
+                       "selection-background-color: rgb(0, 129, 255); selection-color: rgb(255, 255, 255);")
+            .arg(FONT_SIZE));
+    const QRect text = getTextRect();
+    setTextMargins(text.left(), 0, width() - text.right() - 1, 0);
+
+    auto* checker = new EditorRegExpValidator(FOLDER_PICKER_REGEXP, this);
+    setValidator(checker);
+    connect(checker, &EditorRegExpValidator::invalidText, this, &FolderEditor::signalInvalidInput);
+    connect(checker, &EditorRegExpValidator::longText, this, &FolderEditor::signalLongInput);
+    connect(checker, &EditorRegExpValidator::validText, this, &FolderEditor::signalValidInput);
+}
+
+QRect FolderEditor::getTextRect() const
+{
+    return rect().adjusted(qMax(TEXT_MARGIN, mLeft.width()), 0, -qMax(TEXT_MARGIN, mRight.width()), 0);
+}
+
+bool FolderEditor::event(QEvent* event)
+{
+    switch (static_cast<int>(event->type())) {
+    case QEvent::TouchBegin:
+    case QEvent::TouchUpdate:
+    case QEvent::TouchEnd:
+    case QEvent::TouchCancel:
+        return handleTouch(static_cast<QTouchEvent*>(event));
+    case KSInputContext::SoftKeyBoardCloseType:
+        emit signalPressedClose();
+        return true;
+    default:
+        return QLineEdit::event(event);
+    }
+}
+
+bool FolderEditor::handleTouch(QTouchEvent* event)
+{
+    event->accept();
+    if (event->type() == QEvent::TouchCancel) {
+        mTouchId = -1;
+        return true;
+    }
+    if (event->type() == QEvent::TouchBegin && mTouchId == -1 && !event->points().isEmpty()) {
+        mTouchId = event->points().constFirst().id();
+        sendMouse(QEvent::MouseButtonPress, event->points().constFirst().globalPosition());
+        return true;
+    }
+    for (const QEventPoint& point : event->points()) {
+        if (point.id() != mTouchId)
+            continue;
+        const bool released =
+            point.state() == QEventPoint::State::Released || event->type() == QEvent::TouchEnd;
+        if (released)
+            mTouchId = -1;
+        sendMouse(released ? QEvent::MouseButtonRelease : QEvent::MouseMove, point.globalPosition());
+        return true;
+    }
+    return true;
+}
+
+void FolderEditor::sendMouse(QEvent::Type type, const QPointF& globalPosition)
+{
+    const bool release = type == QEvent::MouseButtonRelease;
+    QMouseEvent mouse(type, mapFromGlobal(globalPosition), globalPosition,
+                      type == QEvent::MouseMove ? Qt::NoButton : Qt::LeftButton,
+                      release ? Qt::NoButton : Qt::LeftButton, Qt::NoModifier);
+    if (type == QEvent::MouseButtonPress)
+        mousePressEvent(&mouse);
+    else if (release)
+        mouseReleaseEvent(&mouse);
+    else
+        mouseMoveEvent(&mouse);
+}
+
+void FolderEditor::keyPressEvent(QKeyEvent* event)
+{
+    switch (event->key()) {
+    case Qt::Key_Enter:
+    case Qt::Key_Return:
+        event->accept();
+        emit signalPressedEnter();
+        return;
+    case Qt::Key_Escape:
+        event->accept();
+        emit signalPressedEscape();
+        return;
+    default:
+        QLineEdit::keyPressEvent(event);
+    }
+}
+
+void FolderEditor::paintEvent(QPaintEvent* event)
+{
+    {
+        QPainter painter(this);
+        drawFrame(painter);
+    }
+    QLineEdit::paintEvent(event);
+}
+
+void FolderEditor::drawFrame(QPainter& painter) const
+{
+    const NineSlice::Triple places = NineSlice::row(rect(), mLeft.width(), mRight.width());
+    const QPixmap* pieces[] = {&mLeft, &mCenter, &mRight};
+    for (size_t i = 0; i < places.size(); ++i) {
+        if (!pieces[i]->isNull() && !places[i].isEmpty())
+            painter.drawPixmap(places[i], *pieces[i]);
+    }
+}
+
+// A row that goes takes its editor along; a dialog that hides does not.
+void FolderEditor::hideEvent(QHideEvent* event)
+{
+    QLineEdit::hideEvent(event);
+    if (isHidden() && !mEnded) {
+        mEnded = true;
+        emit signalEditStateEnd();
+    }
+}

@@ -1,0 +1,252 @@
+#include "library/FolderPickerFactory.h"
+
+#include "document/ArchiveController.h"
+#include "document/ArchiveOrder.h"
+#include "library/FolderEditor.h"
+#include "library/FolderNameRules.h"
+#include "touchui/KSModelAttributeItem.h"
+#include "touchui/KSVIEW.h"
+
+#include <QDateTime>
+#include <QDir>
+#include <QIcon>
+#include <QModelIndex>
+
+const QString FolderPickerFactory::DATE_FORMAT = QStringLiteral("yyyy-MM-dd hh:mm");
+const QString FolderPickerFactory::FOLDER_ICON = QStringLiteral(":/FolderPicker/Picker_Icon_Enabel");
+
+namespace
+{
+
+// A node is a folder's number and, counted from 1, a title's place in it.
+constexpr int TITLE_BITS = 16;
+constexpr quintptr TITLE_MASK = (quintptr(1) << TITLE_BITS) - 1;
+
+int folderOf(void* node)
+{
+    return static_cast<int>(reinterpret_cast<quintptr>(node) >> TITLE_BITS);
+}
+
+int titleOf(void* node)
+{
+    return static_cast<int>(reinterpret_cast<quintptr>(node) & TITLE_MASK) - 1;
+}
+
+void* nodeOf(int folder, int title = -1)
+{
+    return reinterpret_cast<void*>((static_cast<quintptr>(folder) << TITLE_BITS) |
+                                   static_cast<quintptr>(title + 1));
+}
+
+} // namespace
+
+FolderPickerFactory::FolderPickerFactory(QObject* parent) : KSModelDataFactory(parent)
+{
+    setColumnDataType(NameColumn, NameDataType);
+    setColumnDataType(DateColumn, DateDataType);
+}
+
+QWidget* FolderPickerFactory::createControl(QWidget* parent, _controlType, const QModelIndex& index)
+{
+    if (getColumnDataType(index.column()) != NameDataType || !index.data(KSVIEW::ItemIsForderRole).toBool())
+        return nullptr;
+    auto* editor = new FolderEditor(parent);
+    mEditor = editor;
+    emit signalCreateEditor(editor);
+    return editor;
+}
+
+void FolderPickerFactory::slotReleaseEditor()
+{
+    mEditor = nullptr;
+}
+
+void FolderPickerFactory::importSourceData()
+{
+    mFolders.clear();
+    mTitleInfos.clear();
+    mTitleNames.clear();
+    if (mRootPath.isEmpty())
+        return;
+    const QStringList names =
+        QDir(mRootPath).entryList(QDir::Dirs | QDir::NoDotAndDotDot, QDir::Name | QDir::IgnoreCase);
+    for (const QString& name : names)
+        mFolders.append(folderOf(takeFolder(name)));
+}
+
+void* FolderPickerFactory::takeFolder(const QString& name)
+{
+    int number = mNumbers.value(name);
+    if (number == 0) {
+        number = static_cast<int>(mFolderNames.size()) + 1;
+        mNumbers.insert(name, number);
+        mFolderNames.insert(number, name);
+    }
+    mTitleInfos.remove(number);
+    mTitleNames.remove(number);
+    return nodeOf(number);
+}
+
+void FolderPickerFactory::renameFolder(const QString& oldName, const QString& newName)
+{
+    const int number = mNumbers.take(oldName);
+    if (number == 0)
+        return;
+    // A folder that had the new name before has gone; its number stands for nothing now.
+    if (const int gone = mNumbers.value(newName); gone != 0)
+        mFolderNames[gone] = QString();
+    mNumbers.insert(newName, number);
+    mFolderNames[number] = newName;
+    mTitleInfos.remove(number);
+    mTitleNames.remove(number);
+}
+
+void FolderPickerFactory::getChildInfo(const QString& path, int folder)
+{
+    QStringList names;
+    const QList<QFileInfo> titles = getTitlerFiles(folder, path);
+    for (const QFileInfo& title : titles)
+        names.append(title.completeBaseName());
+    mTitleInfos.insert(folder, titles);
+    mTitleNames.insert(folder, names);
+}
+
+QList<QFileInfo> FolderPickerFactory::getTitlerFiles(int, const QString& path)
+{
+    QList<QFileInfo> titles;
+    if (mDisk.isNullDirectory(QFileInfo(path)))
+        return titles;
+    ArchiveController controller; // keeps the rows
+    for (const ArchiveOrder* row : controller.getFileOrder(path)) {
+        const QString name = QString::fromStdString(row->getArchivePath());
+        if (!FolderNameRules::isFolderName(name) || !QDir::match(QStringLiteral("*.xml"), name))
+            continue;
+        const QFileInfo info(path + QLatin1Char('/') + name);
+        if (info.isFile())
+            titles.append(info);
+        if (titles.size() >= static_cast<qsizetype>(TITLE_MASK) - 1)
+            break;
+    }
+    return titles;
+}
+
+void FolderPickerFactory::ensureChildInfo(int folder)
+{
+    const QString name = mFolderNames.value(folder);
+    if (!name.isEmpty() && !mTitleInfos.contains(folder))
+        getChildInfo(mRootPath + QLatin1Char('/') + name, folder);
+}
+
+void* FolderPickerFactory::getNextNode(void* node)
+{
+    const int folder = folderOf(node);
+    const int title = titleOf(node);
+    if (title >= 0) {
+        ensureChildInfo(folder);
+        return title + 1 < mTitleInfos.value(folder).size() ? nodeOf(folder, title + 1) : nullptr;
+    }
+    const qsizetype place = mFolders.indexOf(folder);
+    return place >= 0 && place + 1 < mFolders.size() ? nodeOf(mFolders.at(place + 1)) : nullptr;
+}
+
+void* FolderPickerFactory::getChildNode(void* node)
+{
+    if (node == nullptr)
+        return mFolders.isEmpty() ? nullptr : nodeOf(mFolders.constFirst());
+    if (titleOf(node) >= 0)
+        return nullptr;
+    ensureChildInfo(folderOf(node));
+    return mTitleInfos.value(folderOf(node)).isEmpty() ? nullptr : nodeOf(folderOf(node), 0);
+}
+
+QFileInfo FolderPickerFactory::getNewFolderInfo(const QString& name) const
+{
+    return QFileInfo(mRootPath + QLatin1Char('/') + name);
+}
+
+QFileInfo FolderPickerFactory::getNodeInfo(void* node)
+{
+    const int folder = folderOf(node);
+    const QString name = mFolderNames.value(folder);
+    if (name.isEmpty())
+        return {};
+    if (titleOf(node) < 0)
+        return getNewFolderInfo(name);
+    ensureChildInfo(folder);
+    return mTitleInfos.value(folder).value(titleOf(node));
+}
+
+void FolderPickerFactory::InstallItemAttribute(KSModelAttributeItem* item, void* node)
+{
+    const QFileInfo info = getNodeInfo(node);
+    if (titleOf(node) < 0)
+        setFolderAttribute(item, mFolderNames.value(folderOf(node)), info);
+    else
+        setAttributes(item, mTitleNames.value(folderOf(node)).value(titleOf(node)), info.lastModified(),
+                      false);
+}
+
+void FolderPickerFactory::setFolderAttribute(KSModelAttributeItem* item, const QString& name,
+                                             const QFileInfo& info) const
+{
+    setAttributes(item, name, info.exists() ? info.lastModified() : QDateTime::currentDateTime(), true);
+}
+
+void FolderPickerFactory::setAttributes(KSModelAttributeItem* item, const QString& name,
+                                        const QDateTime& date, bool folder) const
+{
+    setDisplayAttribute(item, name, date.toString(DATE_FORMAT));
+    setDecorationAttribute(item, folder);
+    setEditAttribute(item, name);
+    setFontAttribute(item);
+    setTextAlignmentAttribute(item);
+    setItemEditableAttribute(item, folder);
+    setitemOtherAttribute(item, date, folder);
+}
+
+void FolderPickerFactory::setDisplayAttribute(KSModelAttributeItem* item, const QString& name,
+                                              const QString& date) const
+{
+    item->setAttributeMaxKey(Qt::DisplayRole, DateColumn);
+    item->setAttribute(Qt::DisplayRole, name, NameColumn);
+    item->setAttribute(Qt::DisplayRole, date, DateColumn);
+}
+
+void FolderPickerFactory::setDecorationAttribute(KSModelAttributeItem* item, bool folder) const
+{
+    if (!folder)
+        return;
+    item->setAttributeMaxKey(Qt::DecorationRole, DateColumn);
+    item->setAttribute(Qt::DecorationRole, QIcon(FOLDER_ICON), NameColumn);
+}
+
+void FolderPickerFactory::setEditAttribute(KSModelAttributeItem* item, const QString& name) const
+{
+    item->setAttributeMaxKey(Qt::EditRole, DateColumn);
+    item->setAttribute(Qt::EditRole, name, NameColumn);
+}
+
+void FolderPickerFactory::setFontAttribute(KSModelAttributeItem* item) const
+{
+    item->setAttribute(Qt::FontRole, mFont, NameColumn);
+}
+
+void FolderPickerFactory::setTextAlignmentAttribute(KSModelAttributeItem* item) const
+{
+    item->setAttribute(Qt::TextAlignmentRole, static_cast<int>(Qt::AlignLeft | Qt::AlignVCenter), NameColumn);
+}
+
+// Only folders take another name, and only in their name's cell.
+void FolderPickerFactory::setItemEditableAttribute(KSModelAttributeItem* item, bool folder) const
+{
+    item->setAttributeMaxKey(KSVIEW::ItemEditableRole, DateColumn);
+    item->setAttribute(KSVIEW::ItemEditableRole, folder, NameColumn);
+    item->setAttribute(KSVIEW::ItemEditableRole, false, DateColumn);
+}
+
+void FolderPickerFactory::setitemOtherAttribute(KSModelAttributeItem* item, const QDateTime& date,
+                                                bool folder) const
+{
+    item->setAttribute(KSVIEW::ItemIsForderRole, folder, NameColumn);
+    item->setAttribute(KSVIEW::ItemDateRole, date, NameColumn);
+}

@@ -1,0 +1,390 @@
+// What the file manager and other processes do to folders while the folder picker shows, while a name is
+// being typed in it, and while it is hidden.
+#include "FolderPickerFixture.h"
+
+#include <QLabel>
+
+class TestFolderChanges : public QObject
+{
+    Q_OBJECT
+
+private slots:
+    void initTestCase()
+    {
+        Q_INIT_RESOURCE(UILibrary);
+        Q_INIT_RESOURCE(TitlerToolResource);
+    }
+    void init()
+    {
+        f.reset();
+        f.make("a", {"t1", "t2"});
+        f.make("b", {"t3"});
+        f.make("c");
+        f.open();
+    }
+    void cleanup() { f.close(); }
+
+    // --- Renames --------------------------------------------------------------------------------------
+
+    void renameOfAFolder_data()
+    {
+        QTest::addColumn<bool>("paths");
+        QTest::newRow("names") << false;
+        QTest::newRow("full paths") << true;
+    }
+
+    void renameOfAFolder()
+    {
+        QFETCH(bool, paths);
+        f.tree()->expand(f.row("a"));
+        f.tap(f.row("t2", f.row("a")));
+        renameOutside("a", QStringLiteral("天气"), paths);
+        QCOMPARE(f.names(), QStringList({QStringLiteral("天气"), "b", "c"}));
+        QCOMPARE(f.names(f.row(QStringLiteral("天气"))), QStringList({"t1", "t2"}));
+        QVERIFY(f.isEditable(QStringLiteral("天气")));
+        QSignalSpy folder(f.picker.get(), &FolderPicker::changeFolderPath);
+        f.tap(QStringLiteral("天气"));
+        f.tapButton("openFolderButton");
+        QCOMPARE(folder.at(0).at(0).toString(), f.path(QStringLiteral("天气")));
+    }
+
+    void renameOfTheNameThatIsBeingTyped()
+    {
+        f.hold("a");
+        f.type("xyz");
+        f.service->calls.clear();
+        f.service->shown.clear();
+        renameOutside("a", "later");
+        QVERIFY(f.picker->editor());
+        QCOMPARE(f.picker->editor()->text(), QStringLiteral("later"));
+        // The keyboard is closed and opened again on the same field.
+        QVERIFY(f.service->calls.indexOf("close") >= 0);
+        QVERIFY(f.service->calls.indexOf("close") < f.service->calls.lastIndexOf("show"));
+        QCOMPARE(f.service->shown.constLast().title, std::wstring(L"Folder Name"));
+        QCOMPARE(f.service->shown.constLast().lastValue, 2);
+        f.reports.take();
+        f.enter("mine");
+        QCOMPARE(f.folders(), QStringList({"b", "c", "mine"}));
+        QCOMPARE(f.names(), QStringList({"mine", "b", "c"}));
+        QCOMPARE(f.reports.take(), QStringList{"renamed later to mine"});
+        QCOMPARE(f.names(f.row("mine")), QStringList({"t1", "t2"}));
+    }
+
+    void renameOfTheNameThatIsBeingTypedAndGivenUp()
+    {
+        f.hold("a");
+        renameOutside("a", "later");
+        f.escape();
+        QVERIFY(!f.picker->editor());
+        QCOMPARE(f.names(), QStringList({"later", "b", "c"}));
+        QCOMPARE(f.folders(), QStringList({"b", "c", "later"}));
+    }
+
+    void renameOfAnotherFolderDuringAnEdit()
+    {
+        f.hold("b");
+        renameOutside("a", "later");
+        QVERIFY(f.picker->editor());
+        QCOMPARE(f.picker->editor()->text(), QStringLiteral("b"));
+        QCOMPARE(f.names(), QStringList({"later", "b", "c"}));
+        // The new name of the other is in use now, the old one free.
+        f.enter("LATER");
+        QCOMPARE(f.messages.take(), (Reports{{47, QStringLiteral("LATER")}}));
+        f.answerClash();
+        f.enter("a");
+        QCOMPARE(f.folders(), QStringList({"a", "c", "later"}));
+    }
+
+    void renameOfASourceDuringItsDuplication()
+    {
+        f.tap("a");
+        f.tapButton("duplicateFolderButton");
+        renameOutside("a", "later");
+        f.enter("copy");
+        QCOMPARE(f.folders(), QStringList({"b", "c", "copy", "later"}));
+        QCOMPARE(LibraryFixture::order(f.path("copy")), QStringList({"t1", "t2"}));
+        QCOMPARE(f.names(f.row("later")), QStringList({"t1", "t2"}));
+    }
+
+    void renameToTheNameThatIsBeingMade()
+    {
+        f.tapButton("newFolderButton");
+        renameOutside("a", "Untitled");
+        f.enter();
+        QCOMPARE(f.messages.take(), (Reports{{47, QStringLiteral("Untitled")}}));
+        f.answerClash();
+        f.enter("new");
+        QCOMPARE(f.folders(), QStringList({"Untitled", "b", "c", "new"}));
+        QCOMPARE(f.names(), QStringList({"Untitled", "b", "c", "new"}));
+        QCOMPARE(f.names(f.row("Untitled")), QStringList({"t1", "t2"}));
+    }
+
+    void renameOfTheOpenFolder()
+    {
+        f.picker->setCurrentFolderName("a");
+        QSignalSpy change(f.picker.get(), &FolderPicker::folderNameChange);
+        QSignalSpy clear(f.picker.get(), &FolderPicker::clearUndoCommandStack);
+        renameOutside("a", "later");
+        QCOMPARE(change.count(), 1);
+        QCOMPARE(change.at(0).at(0).toString(), f.path("a"));
+        QCOMPARE(change.at(0).at(1).toString(), f.path("later"));
+        // The steps back speak of paths that are no more.
+        QCOMPARE(clear.count(), 1);
+        QCOMPARE(f.picker->currentFolderName(), QStringLiteral("later"));
+        QVERIFY(!f.isEditable("later"));
+        renameOutside("b", "other");
+        QCOMPARE(change.count(), 1);
+        QVERIFY(f.isEditable("other"));
+    }
+
+    void renameWhileHidden()
+    {
+        f.picker->setCurrentFolderName("a");
+        f.picker->hide();
+        QSignalSpy change(f.picker.get(), &FolderPicker::folderNameChange);
+        renameOutside("a", "later");
+        renameOutside("b", "other");
+        QCOMPARE(f.picker->currentFolderName(), QStringLiteral("later"));
+        QCOMPARE(change.count(), 1);
+        QCOMPARE(f.names(), QStringList({"a", "b", "c"}));
+        f.picker->updateTreeView();
+        f.picker->show();
+        QCOMPARE(f.names(), QStringList({"c", "later", "other"}));
+        QVERIFY(!f.isEditable("later"));
+        QVERIFY(f.isEditable("other"));
+    }
+
+    void renamesThatSaySomethingElse_data()
+    {
+        QTest::addColumn<QString>("before");
+        QTest::addColumn<QString>("after");
+        QTest::newRow("nothing") << QString() << QString();
+        QTest::newRow("no new name") << "a" << QString();
+        QTest::newRow("no old name") << QString() << "later";
+        QTest::newRow("parent") << "a"
+                                << "..";
+        QTest::newRow("itself") << "."
+                                << "later";
+        QTest::newRow("slashes") << "///"
+                                 << "///";
+        QTest::newRow("unknown") << "gone"
+                                 << "later";
+        QTest::newRow("huge") << QString(100000, QLatin1Char('x')) << QString(100000, QLatin1Char('y'));
+    }
+
+    void renamesThatSaySomethingElse()
+    {
+        QFETCH(QString, before);
+        QFETCH(QString, after);
+        f.picker->setCurrentFolderName("a");
+        QSignalSpy change(f.picker.get(), &FolderPicker::folderNameChange);
+        notify(before, after);
+        QCOMPARE(f.names(), QStringList({"a", "b", "c"}));
+        QCOMPARE(f.picker->currentFolderName(), QStringLiteral("a"));
+        QCOMPARE(change.count(), 0);
+        QCOMPARE(f.folders(), QStringList({"a", "b", "c"}));
+    }
+
+    // --- Deletions ------------------------------------------------------------------------------------
+
+    void deletionOfTheChosenFolder_data()
+    {
+        QTest::addColumn<QString>("name");
+        QTest::newRow("its name") << "a";
+        QTest::newRow("in another case") << "A";
+        QTest::newRow("full path") << f.path("a");
+        QTest::newRow("with a slash") << f.path("a") + "/";
+    }
+
+    void deletionOfTheChosenFolder()
+    {
+        QFETCH(QString, name);
+        f.tree()->expand(f.row("a"));
+        f.tap(f.row("t1", f.row("a")));
+        QVERIFY(thumbnail()->isVisible());
+        QDir(f.path("a")).removeRecursively();
+        f.picker->slotDeleteFolder(name.toStdWString());
+        QCOMPARE(f.buttons(), QStringLiteral("-+-+"));
+        QCOMPARE(f.current(), QString());
+        QVERIFY(!thumbnail()->isVisible());
+        QCOMPARE(f.picker->findChild<QLabel*>("folderFileSize")->text(), QString());
+        QCOMPARE(f.names(), QStringList({"b", "c"}));
+    }
+
+    void deletionOfAnotherFolder()
+    {
+        f.tap("b");
+        deleteOutside("a");
+        QCOMPARE(f.names(), QStringList({"b", "c"}));
+        QCOMPARE(f.current(), QStringLiteral("b"));
+        QCOMPARE(f.buttons(), QStringLiteral("++++"));
+    }
+
+    void deletionOfTheOpenFolder()
+    {
+        f.picker->setCurrentFolderName("a");
+        deleteOutside("a");
+        QCOMPARE(f.picker->currentFolderName(), QString());
+        QCOMPARE(f.names(), QStringList({"b", "c"}));
+    }
+
+    void deletionOfTheNameThatIsBeingTyped()
+    {
+        f.hold("a");
+        f.type("x");
+        deleteOutside("a");
+        QTRY_VERIFY(!f.picker->editor());
+        QCOMPARE(f.picker->editAction(), FolderPicker::FOLDER_EDIT_NONE);
+        QCOMPARE(f.names(), QStringList({"b", "c"}));
+        QCOMPARE(f.folders(), QStringList({"b", "c"}));
+        QVERIFY(f.service->calls.contains(QStringLiteral("close")));
+        f.tapButton("newFolderButton");
+        f.enter("new");
+        QCOMPARE(f.folders(), QStringList({"b", "c", "new"}));
+    }
+
+    void deletionUnderAClash()
+    {
+        f.hold("a");
+        f.enter("b");
+        QCOMPARE(f.messages.take(), (Reports{{47, QStringLiteral("b")}}));
+        deleteOutside("a");
+        f.answerClash();
+        QVERIFY(!f.picker->editor());
+        f.tap("b");
+        QCOMPARE(f.current(), QStringLiteral("b"));
+    }
+
+    void deletionOfAnotherFolderDuringAnEdit()
+    {
+        f.hold("a");
+        deleteOutside("b");
+        QVERIFY(f.picker->editor());
+        f.enter("b");
+        QCOMPARE(f.messages.take(), Reports());
+        QCOMPARE(f.folders(), QStringList({"b", "c"}));
+        QCOMPARE(f.names(f.row("b")), QStringList({"t1", "t2"}));
+    }
+
+    void deletionOfASourceDuringItsDuplication()
+    {
+        f.tap("a");
+        f.tapButton("duplicateFolderButton");
+        deleteOutside("a");
+        f.enter("copy");
+        // There was nothing to copy.
+        QVERIFY(!f.picker->editor());
+        QVERIFY(!QFileInfo::exists(f.path("copy")));
+        QCOMPARE(f.titles.take(), Reports());
+        // The row that stands for no folder goes when it is used.
+        f.tap("copy");
+        f.tapButton("openFolderButton");
+        QCOMPARE(f.names(), QStringList({"b", "c"}));
+        QVERIFY(f.picker->isVisible());
+    }
+
+    void deletionOfANameThatIsOnlyBeingMade()
+    {
+        f.tapButton("newFolderButton");
+        f.picker->slotDeleteFolder(L"Untitled");
+        QVERIFY(f.picker->editor());
+        f.enter();
+        QVERIFY(QFileInfo(f.path("Untitled")).isDir());
+    }
+
+    void deletionWhileHidden()
+    {
+        f.tap("a");
+        f.picker->setCurrentFolderName("a");
+        f.picker->hide();
+        deleteOutside("a");
+        QCOMPARE(f.picker->currentFolderName(), QString());
+        QCOMPARE(f.names(), QStringList({"b", "c"}));
+        f.picker->show();
+        QVERIFY(!f.button("openFolderButton")->isEnabled() || f.current() != QStringLiteral("a"));
+        f.picker->openFolder();
+    }
+
+    void deletionsThatSaySomethingElse()
+    {
+        f.tap("a");
+        for (const wchar_t* name : {L"", L"/", L"gone", L"..", L"a/..", L"ab"})
+            f.picker->slotDeleteFolder(name);
+        f.picker->slotDeleteFolder(std::wstring(100000, L'x'));
+        QCOMPARE(f.names(), QStringList({"a", "b", "c"}));
+        QCOMPARE(f.current(), QStringLiteral("a"));
+    }
+
+    // --- Folders that come ----------------------------------------------------------------------------
+
+    void importsShowWithTheNextReading()
+    {
+        f.tap("b");
+        f.make("imported", {"t9"});
+        f.picker->setCurrentFolderName("b");
+        f.picker->updateTreeView();
+        QCOMPARE(f.names(), QStringList({"a", "b", "c", "imported"}));
+        QCOMPARE(f.names(f.row("imported")), QStringList{"t9"});
+        QCOMPARE(f.picker->currentFolderName(), QStringLiteral("b"));
+        QCOMPARE(f.buttons().at(0), QLatin1Char('-'));
+        QCOMPARE(f.buttons().at(2), QLatin1Char('-'));
+    }
+
+    void anImportTakesTheNameThatIsBeingMade()
+    {
+        f.tapButton("newFolderButton");
+        f.make("new", {"t9"}); // without a word
+        f.enter("new");
+        QVERIFY(!f.picker->editor());
+        QCOMPARE(f.names(), QStringList({"a", "b", "c", "new"}));
+        QCOMPARE(f.names(f.row("new")), QStringList{"t9"});
+        QCOMPARE(f.titles.take(), Reports());
+    }
+
+    void aReadingEndsAnEdit()
+    {
+        f.hold("a");
+        f.picker->updateTreeView();
+        QTRY_VERIFY(!f.picker->editor());
+        QCOMPARE(f.names(), QStringList({"a", "b", "c"}));
+        f.tapButton("newFolderButton");
+        f.picker->updateTreeView();
+        QTRY_VERIFY(!f.picker->editor());
+        QTRY_COMPARE(f.names(), QStringList({"a", "b", "c"}));
+        QCOMPARE(f.folders(), QStringList({"a", "b", "c"}));
+    }
+
+private:
+    void notify(const QString& before, const QString& after)
+    {
+        FileManagerDefine::tagChangeFolderNameParam param;
+        param.oldPath = before.toStdWString();
+        param.newPath = after.toStdWString();
+        f.picker->folderNameChanged(param);
+    }
+    void renameOutside(const QString& before, const QString& after, bool paths = false)
+    {
+        QVERIFY(QDir(f.root()).rename(before, after));
+        notify(paths ? f.path(before) : before, paths ? f.path(after) : after);
+    }
+    void deleteOutside(const QString& name)
+    {
+        QVERIFY(QDir(f.path(name)).removeRecursively());
+        f.picker->slotDeleteFolder(name.toStdWString());
+    }
+    QLabel* thumbnail() const { return f.picker->findChild<QLabel*>("folderThumbnail"); }
+
+    FolderPickerFixture f;
+};
+
+int main(int argc, char** argv)
+{
+    KSInputContext::install();
+    QApplication app(argc, argv);
+    app.setObjectName(QStringLiteral("Titler"));
+    TestFolderChanges test;
+    QTEST_SET_MAIN_SOURCE_PATH
+    return QTest::qExec(&test, argc, argv);
+}
+
+#include "tst_folderchanges.moc"
