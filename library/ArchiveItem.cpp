@@ -145,6 +145,9 @@ void ArchiveItem::updateLeftChild(QImage image)
         if (QFileInfo(path).isFile()) // a pipe would be waited for
             image = QImageReader(path).read();
     }
+    // A picture of foreign making may be of any size; what does not fit would only cost memory.
+    if (image.width() > LEFT_CHILD_WIDTH || image.height() > CHILD_HEIGHT)
+        image = image.scaled(LEFT_CHILD_WIDTH, CHILD_HEIGHT, Qt::KeepAspectRatio, Qt::SmoothTransformation);
     mPixmapItem->setPixmap(image.isNull() ? QPixmap() : QPixmap::fromImage(image));
 }
 

@@ -63,7 +63,12 @@ public:
     void open(const QString& folder)
     {
         list->refreshArchiveList(folder);
-        QCoreApplication::processEvents();
+        const bool complete = QTest::qWaitFor([this] {
+            const ArchiveItem* last = item(list->count() - 1);
+            return !last || last->hasChildWidgets();
+        });
+        if (!complete)
+            qFatal("the titles have no pictures");
         canvas.clear();
     }
 
