@@ -58,11 +58,15 @@ QStringList Monkey::play(GalleryPage& page, int steps)
     for (int i = 1; i <= steps; ++i) {
         step(page);
         QCoreApplication::processEvents();
-        if (i % STEPS_PER_REST == 0) {
+        if (i % STEPS_PER_REST == 0 || i == steps) {
             m_fingers.liftAll();
+            QCoreApplication::processEvents();
+            // At once: the watchdog must not be what frees it.
+            if (m_filter->isLock(nullptr, LOCKMETHOD_TOUCH)) {
+                return {QStringLiteral("step %1: the touch lock is held by %2").arg(i).arg(holders())};
+            }
         }
     }
-    m_fingers.liftAll();
     QStringList problems;
     QDeadlineTimer deadline(SETTLE_TIME);
     do {
@@ -168,7 +172,7 @@ void Monkey::mouse(GalleryPage& page)
             handle, window->mapFromGlobal(position), position, buttons, button, type);
     };
     if (number(4) == 0) {
-        QWindowSystemInterface::handleWheelEvent<QWindowSystemInterface::SynchronousDelivery>(
+        QWindowSystemInterface::handleWheelEvent(
             handle, window->mapFromGlobal(place), place, QPoint(), QPoint(0, number(2) == 0 ? 120 : -120));
         return;
     }
@@ -183,12 +187,23 @@ void Monkey::mouse(GalleryPage& page)
     }
 }
 
+QString Monkey::holders() const
+{
+    QStringList names;
+    const QMap<KSLockObject*, QList<QObject*>> active = m_filter->activateLockObjects();
+    for (const QList<QObject*>& objects : active) {
+        for (QWidget* widget : QApplication::allWidgets()) {
+            if (objects.contains(widget)) {
+                names.append(describe(widget));
+            }
+        }
+    }
+    return names.isEmpty() ? QStringLiteral("what is gone") : names.join(QStringLiteral(", "));
+}
+
 QStringList Monkey::leftovers(const GalleryPage&) const
 {
     QStringList problems;
-    if (m_filter->isLock(nullptr, LOCKMETHOD_TOUCH)) {
-        problems.append(QStringLiteral("the touch lock is held"));
-    }
     if (QWidget* grabber = QWidget::mouseGrabber()) {
         problems.append(QStringLiteral("the mouse is grabbed by ") + describe(grabber));
     }

@@ -28,6 +28,7 @@ private:
     int number(int below) { return static_cast<int>(m_random.bounded(below)); }
     QList<QWidget*> windows(const GalleryPage& page) const;
     QPoint anyPoint(QWidget* window);
+    QString holders() const;
     QStringList leftovers(const GalleryPage& page) const;
 
     KSAppEventFilter* m_filter;

@@ -6,10 +6,10 @@
 //   gallery --digest DIR         writes the digests that pictures are compared with
 //   gallery --monkey SEED COUNT  plays COUNT random steps over all pages; ends 1 when something is left
 //   pressed
+#include "app/APPEventFilter.h"
 #include "gallery/GalleryPages.h"
 #include "gallery/Monkey.h"
 #include "gallery/PagePicture.h"
-#include "touchui/KSAppEventFilter.h"
 
 #include <QApplication>
 #include <QDir>
@@ -85,10 +85,7 @@ int shoot(const QDir& folder, bool digests, const QStringList& names)
 
 int playMonkey(quint32 seed, int count, const QStringList& names)
 {
-    KSAppEventFilter filter;
-    filter.setObjectName(QStringLiteral("gallery"));
-    filter.registerLockObject(&filter, nullptr, LOCKOBJECT_DEFAULTMUTEX, nullptr);
-    QCoreApplication::instance()->installEventFilter(&filter);
+    APPEventFilter* filter = APPEventFilter::instance();
     const QList<GalleryPages::Maker> pages = chosen(names);
     if (pages.isEmpty()) {
         return 2;
@@ -103,13 +100,13 @@ int playMonkey(quint32 seed, int count, const QStringList& names)
         page.show();
         QCoreApplication::processEvents();
         {
-            Monkey monkey(&filter, seed);
+            Monkey monkey(filter, seed);
             for (const QString& problem : monkey.play(page, steps)) {
                 ++failures;
                 std::fprintf(stderr, "  %s\n", qPrintable(problem));
             }
         }
-        filter.unlock();
+        filter->unlock();
         page.close();
     }
     return failures == 0 ? 0 : 1;
@@ -117,9 +114,7 @@ int playMonkey(quint32 seed, int count, const QStringList& names)
 
 int showPages(const QStringList& names)
 {
-    KSAppEventFilter filter;
-    filter.registerLockObject(&filter, nullptr, LOCKOBJECT_DEFAULTMUTEX, nullptr);
-    QCoreApplication::instance()->installEventFilter(&filter);
+    APPEventFilter::instance();
     std::vector<GalleryPage> pages;
     for (const GalleryPages::Maker& maker : chosen(names)) {
         pages.push_back(maker());

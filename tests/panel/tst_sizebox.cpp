@@ -4,6 +4,7 @@
 #include "panel/ComboxLineEditRegExpValidator.h"
 #include "panel/SizeBoxLineEdit.h"
 #include "panel/SizeToolBox.h"
+#include "touchui/KSCombobox.h"
 #include "touchui/CustomComboBoxView.h"
 #include "touchui/KSInputContext.h"
 #include "touchui/KSPushbutton.h"
