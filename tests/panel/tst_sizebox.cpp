@@ -5,6 +5,7 @@
 #include "panel/SizeBoxLineEdit.h"
 #include "panel/SizeToolBox.h"
 #include "touchui/CustomComboBoxView.h"
+#include "touchui/KSCombobox.h"
 #include "touchui/KSInputContext.h"
 #include "touchui/KSPushbutton.h"
 
