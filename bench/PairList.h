@@ -20,6 +20,7 @@ public:
         std::string name;
         double aim; // the ratio that is to be reached
         Clock clock;
+        double limit = 0; // milliseconds that ours may take at most; 0 for any time
     };
 
     using Body = std::function<void(benchmark::State&)>;

@@ -74,10 +74,11 @@ void PairReporter::printPair(const PairList::Pair& pair)
     if (ours <= 0 || floor <= 0)
         return;
     const double ratio = ours / floor;
-    const bool reached = ratio <= pair.aim;
+    constexpr double MILLISECONDS = 1000;
+    const bool inTime = pair.limit <= 0 || ours * MILLISECONDS <= pair.limit;
+    const bool reached = ratio <= pair.aim && inTime;
     if (!reached)
         ++mMissed;
-    constexpr double MILLISECONDS = 1000;
     GetOutputStream() << std::left << std::setw(NAME_WIDTH) << pair.name << std::right << std::fixed
                       << std::setw(NUMBER_WIDTH) << std::setprecision(4) << ours * MILLISECONDS
                       << std::setw(NUMBER_WIDTH) << floor * MILLISECONDS << std::setprecision(2)

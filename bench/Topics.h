@@ -9,6 +9,7 @@ namespace Topics
 
 void addFilter(PairList& list);
 void addMessaging(PairList& list);
+void addPanel(PairList& list);
 void addPictures(PairList& list, const BenchEnvironment& environment);
 void addRendering(PairList& list, const BenchEnvironment& environment);
 void addStart(PairList& list);

@@ -3,7 +3,6 @@
 #include "touchui/KSPushbutton.h"
 
 #include <QHBoxLayout>
-#include <QIcon>
 #include <QLabel>
 
 #include <algorithm>
@@ -60,7 +59,7 @@ KSPushbutton* ToolBox::addButton(Piece piece, const QSize& size, const QString& 
     if (icon.isEmpty())
         button->setStyleSheet(QString::fromLatin1(BUTTON_TEXT_STYLE));
     connectLooks(button);
-    m_buttons.append({button, icon, QString()});
+    m_buttons.append({button, icon, QString(), {}});
     showIcon(m_buttons.last());
     return button;
 }
@@ -168,6 +167,15 @@ void ToolBox::setButtonChosen(KSPushbutton* button)
         showIcon(*entry);
 }
 
+// A look is read and decoded once.
+QIcon ToolBox::iconOf(Button& entry, const QString& name)
+{
+    auto known = entry.icons.find(name);
+    if (known == entry.icons.end())
+        known = entry.icons.insert(name, QIcon(name));
+    return *known;
+}
+
 // A look of its own for each state; a selected piece of a switch keeps its look while it cannot be tapped.
 void ToolBox::showIcon(Button& entry)
 {
@@ -183,5 +191,5 @@ void ToolBox::showIcon(Button& entry)
     if (name == entry.shownIcon)
         return;
     entry.shownIcon = name;
-    entry.button->setIcon(QIcon(name));
+    entry.button->setIcon(iconOf(entry, name));
 }

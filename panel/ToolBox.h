@@ -1,5 +1,7 @@
 #pragma once
 
+#include <QHash>
+#include <QIcon>
 #include <QList>
 #include <QSize>
 #include <QString>
@@ -73,6 +75,7 @@ private:
         KSPushbutton* button;
         QString icon;
         QString shownIcon;
+        QHash<QString, QIcon> icons; // by their paths
     };
     struct Styled {
         QWidget* widget;
@@ -82,6 +85,7 @@ private:
 
     void applyState(bool enabled);
     void showIcon(Button& button);
+    static QIcon iconOf(Button& button, const QString& name);
     Button* find(const KSPushbutton* button);
 
     QList<Button> m_buttons;

@@ -6,6 +6,7 @@
 #include "panel/SizeToolBox.h"
 #include "touchui/KSCombobox.h"
 #include "touchui/CustomComboBoxView.h"
+#include "touchui/KSCombobox.h"
 #include "touchui/KSInputContext.h"
 #include "touchui/KSPushbutton.h"
 
