@@ -18,6 +18,7 @@
 #include "canvas/GraphicsView.h"
 #include "library/ArchiveList.h"
 #include "library/FolderPicker.h"
+#include "library/TemplatePicker.h"
 #include "library/ThumbnailRender.h"
 #include "messaging/services/ISoftKeyBoardController.h"
 #include "panel/TextToolsPanel.h"
@@ -26,6 +27,7 @@
 #include "touchui/KSInputContext.h"
 #include "touchui/KSMenu.h"
 #include "touchui/KSPushbutton.h"
+#include "touchui/KSScrollViewerWidget.h"
 #include "touchui/KSToolTip.h"
 
 #include <QAction>
@@ -85,6 +87,7 @@ TitlerWindow::TitlerWindow(bool deferArchiveList, QWidget* parent)
     setAppDefaultParameter();
     setAttribute(Qt::WA_AcceptTouchEvents);
     KSMenu::setMainWindow(this);
+    KSScrollViewerWidget::s_mainWnd = this;
     ICanvasHost::setInstance(this);
     MessageBoxController::setProvider(
         []() -> MessageBoxController* { return ShowMessageController::getInstance(); },
@@ -120,6 +123,7 @@ TitlerWindow::~TitlerWindow()
     KSToolTip::s_mainWindow = nullptr;
     Balloon::s_ParentWindow = nullptr;
     KSMenu::setMainWindow(nullptr);
+    KSScrollViewerWidget::s_mainWnd.clear();
     delete mArchiveList;
     delete mGraphicsView;
     delete mCanvasScene;
@@ -275,6 +279,7 @@ void TitlerWindow::initChildWindows()
     mOpacityMask->raise();
     mOpacityMask->hide();
     mFolderPicker = new FolderPicker(this);
+    mTemplatePicker = new TemplatePicker(this);
 }
 
 void TitlerWindow::initProcessFactory()

@@ -40,6 +40,7 @@ class ShowMessageController;
 class ShowTitlerController;
 class SystemSetupInfoController;
 class TextToolsPanel;
+class TemplatePicker;
 class TitlerAPPEventFilterController;
 class TitlerPowerController;
 class TitlerProjectDataController;
@@ -99,7 +100,10 @@ public slots:
     void showFolderDialog();
     void openFolderDialog();
     void slotCancelClicked();
+    // Modal; return when the operator has chosen a template or cancelled. The second begins with the
+    // operator's own templates.
     void showTemplateDialog();
+    void showTemplateDialogOnUser();
 
     // Undo.
     void pushUndoStack(QUndoCommand* subUndoCommand); // takes over the command
@@ -128,6 +132,7 @@ public slots:
     void slotCanvasButtonClicked(QAction* action);
     void slotStartPasteArchive();
     void slotStartCreateNewArchiveFromTemplate(Archive* archiveData);
+    void listWidgetReleasedEvent(KSBaseItemWidget* item, QPoint point, KSScrollViewerWidget* viewer);
     void setHasMessageToShowInformation(bool isNeedShow, QString defaultFont);
 
     // Lock reporting.
@@ -171,6 +176,8 @@ private:
     void connectForTextToolsPanel();
     void connectForUndoRedoCommand();
     void connectForController();
+    void connectForTemplates();
+    void connectForTemplateNotices();
     void connectForFolderPicker();
     void connectForFolderNotices();
     void initFolderPicker();
@@ -183,6 +190,7 @@ private:
     void sendTransientControlEvent(bool on);
     void reportHiddenControl();
 
+    void setOpacityMaskVisible(bool visible);
     void showDialogMaskWidget(bool show);
     void showMessageMaskWidget(bool show);
     QWidget* createMask() const;
@@ -208,6 +216,7 @@ private:
     QUndoStack mUndoStack;
     QWidget* mOpacityMask = nullptr;
     FolderPicker* mFolderPicker = nullptr;
+    TemplatePicker* mTemplatePicker = nullptr;
     QWidget* mMessageMask = nullptr;
     QWidget* mDialogMask = nullptr;
     QTranslator* mTranslator = nullptr;

@@ -42,14 +42,12 @@ void TitlerWindow::showFolderDialog()
 {
     if (mFolderPicker->isVisible())
         return;
-    mOpacityMask->setGeometry(rect());
-    mOpacityMask->raise();
-    mOpacityMask->show();
+    setOpacityMaskVisible(true);
     mFolderPicker->setWindowModality(Qt::WindowModal);
     mFolderPicker->raise();
     mFolderPicker->activateWindow();
     mFolderPicker->exec();
-    mOpacityMask->hide();
+    setOpacityMaskVisible(false);
 }
 
 void TitlerWindow::openFolderDialog()

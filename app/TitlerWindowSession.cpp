@@ -7,9 +7,9 @@
 #include "app/SystemSetupInfoController.h"
 #include "app/ToolsBar.h"
 #include "canvas/CanvasScene.h"
-#include "document/Archive.h"
 #include "library/ArchiveList.h"
 #include "library/FolderPicker.h"
+#include "library/TemplatePicker.h"
 #include "panel/TextToolsPanel.h"
 #include "touchui/KSInputContext.h"
 
@@ -43,6 +43,7 @@ void TitlerWindow::showTitlerWindow(titler_paramter paramter)
     mCanvasScene->setModuleInfo(m_emModuleInfo);
     mTextToolsPanel->setModuleInfo(m_emModuleInfo);
     mTextToolsPanel->initTextToolsPanel();
+    mTemplatePicker->setModuleInfo(m_emModuleInfo);
 
     mToolsBar->setFolderButtonEnabled(true);
     initFolderPicker();
@@ -87,16 +88,11 @@ void TitlerWindow::refreshArchiveList(QString path)
     markOpenFolder();
 }
 
-// An empty design stands for the operator's choice.
-void TitlerWindow::showTemplateDialog()
-{
-    Archive blank;
-    slotStartCreateNewArchiveFromTemplate(&blank);
-}
-
 void TitlerWindow::closeTitlerWindow()
 {
     mArchiveList->stopArchiveListTapAndHoldTimer();
+    slotCancelArchiveListMoveMode(); // what is being dragged gets its place while the folder is open
+    mArchiveList->slotHideOptionMenu();
     const QString path = mArchiveList->getCurrentPath();
     saveCurrentTitle();
     clearUndoStack();
@@ -132,6 +128,7 @@ void TitlerWindow::closeTitlerMainWindow()
     if (m_bRealClose) {
         close();
     } else {
+        mTemplatePicker->reject(); // an answered message may come while it is open
         mFolderPicker->setCurrentFolderName(QString());
         hide();
         mCanvasScene->clearCanvas();
@@ -217,12 +214,6 @@ void TitlerWindow::clearUndoStack()
         mArchiveList->clearOperationItemState(item);
 }
 
-void TitlerWindow::slotStartCreateNewArchiveFromTemplate(Archive* archiveData)
-{
-    mArchiveList->createArchiveFromTemplate(archiveData);
-    mCanvasScene->createThumnailPicture();
-}
-
 void TitlerWindow::slotStartPasteArchive()
 {
     mCanvasScene->createThumnailPicture();
@@ -250,6 +241,11 @@ void TitlerWindow::setHasMessageToShowInformation(bool isNeedShow, QString defau
 {
     m_bHasMessage = isNeedShow;
     m_strMessage = std::move(defaultFont);
+}
+
+void TitlerWindow::listWidgetReleasedEvent(KSBaseItemWidget*, QPoint, KSScrollViewerWidget*)
+{
+    hideSoftWareWithOutDeleteEmptyItems();
 }
 
 void TitlerWindow::hideSoftWareWithDeleteEmptyItems()

@@ -7,6 +7,7 @@
 #include "canvas/GraphicsView.h"
 #include "library/ArchiveList.h"
 #include "library/FolderPicker.h"
+#include "library/TemplatePicker.h"
 #include "panel/TextToolsPanel.h"
 #include "support/SystemInfo.h"
 #include "touchui/KSPushbutton.h"
@@ -61,6 +62,8 @@ void TitlerWindow::mousePressEvent(QMouseEvent* event)
 
 bool TitlerWindow::eventFilter(QObject* obj, QEvent* event)
 {
+    if (mArchiveList->getMoveState())
+        return false;
     if (ignoreMouseAndTouchEventWhenArchiveListIsMoveMode(obj, event))
         return true;
     switch (event->type()) {
@@ -266,7 +269,10 @@ void TitlerWindow::showDialogMaskWidget(bool show)
     setAttribute(Qt::WA_AcceptTouchEvents, !show);
     if (!show || mTextToolsPanel->colorPaletteIsShown())
         mTextToolsPanel->showDialogMaskWidget(show);
-    if (!show || (mFolderPicker->isVisible() && !mTextToolsPanel->colorPaletteIsShown()))
+    if (!show || (mTemplatePicker->isVisible() && !mTextToolsPanel->colorPaletteIsShown()))
+        mTemplatePicker->showDialogMaskWidget(show);
+    if (!show || (mFolderPicker->isVisible() && !mTemplatePicker->isVisible() &&
+                  !mTextToolsPanel->colorPaletteIsShown()))
         mFolderPicker->showDialogMaskWidget(show);
 }
 
@@ -285,7 +291,10 @@ void TitlerWindow::showMessageMaskWidget(bool show)
     setAttribute(Qt::WA_AcceptTouchEvents, !show && !isDialogMasked);
     if (!show || mTextToolsPanel->colorPaletteIsShown())
         mTextToolsPanel->showMessageMaskWidget(show);
-    if (!show || (mFolderPicker->isVisible() && !mTextToolsPanel->colorPaletteIsShown()))
+    if (!show || (mTemplatePicker->isVisible() && !mTextToolsPanel->colorPaletteIsShown()))
+        mTemplatePicker->showMessageMaskWidget(show);
+    if (!show || (mFolderPicker->isVisible() && !mTemplatePicker->isVisible() &&
+                  !mTextToolsPanel->colorPaletteIsShown()))
         mFolderPicker->showMessageMaskWidget(show);
 }
 
@@ -293,6 +302,7 @@ void TitlerWindow::slotSystemLanguageChanged(SystemSetupDef::emSystemLanguageTyp
 {
     switchTranslator(systemLanguage);
     useSpecifiedFont(systemLanguage);
+    mTemplatePicker->reloadTemplates(systemLanguage);
 }
 
 void TitlerWindow::slotInputLanguageChanged(SystemSetupDef::emInputLanguageType inputLanguage)
@@ -306,6 +316,7 @@ void TitlerWindow::slotGetModuleInfo(SystemSetupDef::emInformationModel moduleIn
     m_emModuleInfo = moduleInfo;
     mCanvasScene->setModuleInfo(moduleInfo);
     mTextToolsPanel->setModuleInfo(moduleInfo);
+    mTemplatePicker->setModuleInfo(moduleInfo);
 }
 
 void TitlerWindow::switchTranslator(SystemSetupDef::emSystemLanguageType type)
@@ -331,6 +342,7 @@ void TitlerWindow::retranslateUI()
     mToolsBar->translateText();
     mFolderPicker->translateText();
     mArchiveList->translateText();
+    mTemplatePicker->translateText();
 }
 
 void TitlerWindow::useSpecifiedFont(SystemSetupDef::emSystemLanguageType type)
@@ -340,6 +352,7 @@ void TitlerWindow::useSpecifiedFont(SystemSetupDef::emSystemLanguageType type)
     mFolderPicker->setSystemLanFont(QFont(family));
     setStyleSheet(QStringLiteral(" * {font-family:'%1';}").arg(family));
     mArchiveList->setSystemLanFont(family);
+    mTemplatePicker->setSystemLanFont(QFont(family));
 }
 
 void TitlerWindow::changeFontComboxItem(SystemSetupDef::emInformationModel moduleInfo)

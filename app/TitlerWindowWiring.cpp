@@ -24,6 +24,7 @@ void TitlerWindow::connectWidget()
     connectForTextToolsPanel();
     connect(mArchiveList, &ArchiveList::signalStartPasteArchive, this, &TitlerWindow::slotStartPasteArchive);
     connect(this, &TitlerWindow::moveButtonClicked, mArchiveList, &ArchiveList::moveButtonClicked);
+    connectForTemplates();
     connectForFolderPicker();
     connectForUndoRedoCommand();
 }
@@ -69,11 +70,12 @@ void TitlerWindow::connectForTextToolsAndArchiveList()
     connect(mArchiveList, &ArchiveList::itemSetDefaultState, mCanvasScene,
             &CanvasScene::slotMakeSceneThumnail);
     connect(mArchiveList, &ArchiveList::startTemplatePicker, this, &TitlerWindow::showTemplateDialog);
+    connect(mArchiveList, &ArchiveList::startUserTemplatePicker, this,
+            &TitlerWindow::showTemplateDialogOnUser);
     connect(mArchiveList, &ArchiveList::cleanUndoStack, this, &TitlerWindow::clearUndoStack);
     connect(mArchiveList, &ArchiveList::archiveListMenuShow, this,
             &TitlerWindow::hideSoftWareWithDeleteEmptyItems);
-    connect(mArchiveList, &ArchiveList::widgetItemReleased, this,
-            &TitlerWindow::hideSoftWareWithOutDeleteEmptyItems);
+    connect(mArchiveList, &ArchiveList::widgetItemReleased, this, &TitlerWindow::listWidgetReleasedEvent);
     connect(mMoveButton, &QPushButton::clicked, this, &TitlerWindow::hideSoftWareWithDeleteEmptyItems);
 }
 
@@ -156,4 +158,5 @@ void TitlerWindow::connectForController()
             &TitlerWindow::slotShowDialogMaskWidget);
     connect(mShowMessageController, &ShowMessageController::signalsShowMessageMaskWidget, this,
             &TitlerWindow::slotShowMessageMaskWidget);
+    connectForTemplateNotices();
 }

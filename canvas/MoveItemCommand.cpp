@@ -1,6 +1,7 @@
 #include "canvas/MoveItemCommand.h"
 
 #include "canvas/CanvasScene.h"
+#include "canvas/StyleDocument.h"
 #include "document/TText.h"
 
 MoveItemCommand::MoveItemCommand(CanvasScene* scene, int id, QPointF oldPosition, QPointF newPosition,
@@ -22,6 +23,8 @@ void MoveItemCommand::moveTo(QPointF position)
         if (GraphicsText* parent = item->parentTextItem())
             parent->setPos(position);
         item->setPos(0.0, 0.0);
+        // The next change of style starts from this place.
+        item->styles().refreshUndoBaseline();
         item->changeItemToSolidLineState();
     }
     m_scene->update();

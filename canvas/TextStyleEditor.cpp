@@ -142,6 +142,16 @@ void TextStyleEditor::documentChanged(int position, int removed, int added)
     m_item.touchEditor().clearHandleCaret();
 }
 
+void TextStyleEditor::repairTexts(int begin, int end)
+{
+    const QString text = m_item.toPlainText();
+    for (int i = std::max(begin, 0); i < std::min({end, m_styles.count(), int(text.size())}); ++i) {
+        const std::string wanted = StyleDocument::storedText(text, i).toStdString();
+        if (m_styles.at(i)->getText() != wanted)
+            m_styles.at(i)->setText(wanted);
+    }
+}
+
 int TextStyleEditor::cutOffCharsBeyondMaxNum(int position, int added)
 {
     const QString text = m_item.toPlainText();
@@ -227,6 +237,7 @@ void TextStyleEditor::charsAddedChange(int position, int added)
         one.push_back(std::move(style));
         m_styles.insert(at, std::move(one));
     }
+    repairTexts(position - 1, position + int(text.size()) + 1);
     applyFormats(position, position + int(text.size()));
     if (!m_styles.isEmpty())
         setCaretHeight(*m_styles.at(0));
@@ -247,6 +258,7 @@ void TextStyleEditor::charsRemovedChange(int position, int count)
     }
     if (emptied)
         setCaretHeight(*m_styles.lastAlpha().textItems().front());
+    repairTexts(position - 1, position + 1);
     finishLayout();
     updateWidthAndAlign(m_lastWidth);
     applyShadow();
@@ -355,6 +367,8 @@ void TextStyleEditor::changeAllStyleWhenHasSelection(const TText& source, int id
     m_item.parentFollows();
     TText after = m_styles.current();
     Q_EMIT m_item.signalObjectContentsEdited(&before, &after, &beforeLast, &m_styles.lastAlpha());
+    // The next step starts here, also when the last change was a preview.
+    m_styles.refreshUndoBaseline();
     Q_EMIT m_item.signalNotifyTextPropertyAreaObjectSelectionMode(true, true);
     m_styles.forgetNextInsert();
 }

@@ -43,6 +43,8 @@ public:
     // Typing up to now becomes an undo step.
     void pushLastEditTextIntoStack();
     void undoTimeOut();
+    // Whether there is typing that no undo step has taken in yet.
+    bool isTyping() const { return m_undoTimer.isActive(); }
     // Forgets typing that has not become a step: the object is going away.
     void discardBurst() { m_undoTimer.stop(); }
 
@@ -60,6 +62,8 @@ private:
     void styleNewCharacter(int position, bool startOfLine, QChar character, TextStyle& style);
     bool startsFilledLine(int position, int added) const;
     void reconcile();
+    // The texts of the styles there follow the document: a change may have parted or joined a pair.
+    void repairTexts(int begin, int end);
     void startBurst();
     void changeSelectionProperty(int id, const TText& source, int from, int to);
     void changeSelectionPropertyWhenObjectIsEmpty(int id, const TText& source);

@@ -141,7 +141,12 @@ void TouchTextEditor::putCursor(int position)
 
 int TouchTextEditor::clampedPosition(int position) const
 {
-    return std::clamp(position, 0, m_item.document()->characterCount() - 1);
+    const QTextDocument& document = *m_item.document();
+    position = std::clamp(position, 0, document.characterCount() - 1);
+    // Nothing can be typed into the middle of a character; services count characters in their own ways.
+    const bool insidePair = position > 0 && document.characterAt(position).isLowSurrogate() &&
+                            document.characterAt(position - 1).isHighSurrogate();
+    return insidePair ? position - 1 : position;
 }
 
 // Move

@@ -54,11 +54,9 @@ QBrush checkerBrush()
 } // namespace
 
 ArchiveItem::ArchiveItem(Archive* archive, int type, QWidget* parent)
-    : QFrame(parent), mArchive(archive), mType(type)
+    : KSBaseItemWidget(parent), mArchive(archive), mType(type)
 {
     setFixedSize(mType == NARROW_ITEM ? RIGHT_CHILD_WIDTH : WIDGET_WIDTH, WIDGET_HEIGHT);
-    setFocusPolicy(Qt::NoFocus);
-    setAttribute(Qt::WA_StyledBackground);
     setStyleSheet(UN_OPERATE_AND_UN_SELECT_STATE);
 }
 
@@ -87,6 +85,8 @@ void ArchiveItem::initArchiveItemChildWidget()
     createRightChild();
     updateLeftChild(QImage());
     updateRightChild();
+    if (hasDragFlag())
+        setDragFlag(true); // over the new children
 }
 
 void ArchiveItem::createLeftChild()
@@ -94,23 +94,23 @@ void ArchiveItem::createLeftChild()
     mScene = new QGraphicsScene(0, 0, LEFT_CHILD_WIDTH, CHILD_HEIGHT, this);
     mScene->setBackgroundBrush(checkerBrush());
     mPixmapItem = mScene->addPixmap(QPixmap());
-    mView = new QGraphicsView(mScene, this);
-    mView->setAttribute(Qt::WA_TransparentForMouseEvents);
-    mView->setEnabled(false);
-    mView->setStyleSheet(QStringLiteral("border:0;"));
-    mView->setHorizontalScrollBarPolicy(Qt::ScrollBarAlwaysOff);
-    mView->setVerticalScrollBarPolicy(Qt::ScrollBarAlwaysOff);
-    mView->setFixedSize(LEFT_CHILD_WIDTH, CHILD_HEIGHT);
-    mView->move(LEFT_CHILD_POS);
-    mView->show();
+    auto* view = new QGraphicsView(mScene);
+    view->setEnabled(false);
+    view->setStyleSheet(QStringLiteral("border:0;"));
+    view->setHorizontalScrollBarPolicy(Qt::ScrollBarAlwaysOff);
+    view->setVerticalScrollBarPolicy(Qt::ScrollBarAlwaysOff);
+    view->setFixedSize(LEFT_CHILD_WIDTH, CHILD_HEIGHT);
+    setChild(view, CHILD_LEFT);
+    view->move(LEFT_CHILD_POS);
+    view->show();
 }
 
 void ArchiveItem::createRightChild()
 {
     const bool narrow = mType == NARROW_ITEM;
-    mTextWidget = new QWidget(this);
+    mTextWidget = new QWidget;
+    setChild(mTextWidget, CHILD_RIGHT);
     mTextWidget->setObjectName(QStringLiteral("mTextWidget"));
-    mTextWidget->setAttribute(Qt::WA_TransparentForMouseEvents);
     if (narrow)
         mTextWidget->setStyleSheet(QStringLiteral(" QWidget#mTextWidget { background:rgb(38, 38, 38); }"));
     mTextWidget->setFixedSize(RIGHT_CHILD_WIDTH, CHILD_HEIGHT);
@@ -145,6 +145,9 @@ void ArchiveItem::updateLeftChild(QImage image)
         if (QFileInfo(path).isFile()) // a pipe would be waited for
             image = QImageReader(path).read();
     }
+    // A picture of foreign making may be of any size; what does not fit would only cost memory.
+    if (image.width() > LEFT_CHILD_WIDTH || image.height() > CHILD_HEIGHT)
+        image = image.scaled(LEFT_CHILD_WIDTH, CHILD_HEIGHT, Qt::KeepAspectRatio, Qt::SmoothTransformation);
     mPixmapItem->setPixmap(image.isNull() ? QPixmap() : QPixmap::fromImage(image));
 }
 
@@ -156,9 +159,18 @@ void ArchiveItem::updateRightChild()
     font.setPixelSize(mType == NARROW_ITEM ? NARROW_LABEL_HEIGHT - 4 : DISPLY_TEXT_SIZE);
     for (QLabel* label : mLabels) {
         label->setFont(font);
+        placeLine(label);
         label->clear();
     }
     setTextArea();
+}
+
+// Some families leave more room above and below than a line has. What is cut off then is room above the
+// letters and not their descenders.
+void ArchiveItem::placeLine(QLabel* label) const
+{
+    const bool fits = QFontMetrics(label->font()).height() <= label->height();
+    label->setAlignment(Qt::AlignLeft | (fits ? Qt::AlignVCenter : Qt::AlignBottom));
 }
 
 void ArchiveItem::setTextArea()
@@ -213,14 +225,16 @@ QStringList ArchiveItem::textLines() const
     return lines;
 }
 
-ArchiveItem* ArchiveItem::clone() const
+ArchiveItem* ArchiveItem::clone()
 {
     auto archive = mArchive ? std::make_unique<Archive>(*mArchive) : std::make_unique<Archive>();
     auto* item = new ArchiveItem(archive.get(), mType);
     item->mOwnArchive = std::move(archive);
     item->initArchiveItemChildWidget();
-    item->setSelected(mSelected);
-    item->setStyleSheet(mSelected ? OPERATE_AND_SELECT_STATE : OPERATE_AND_UN_SELECT_STATE);
+    if (mPixmapItem && item->mPixmapItem)
+        item->mPixmapItem->setPixmap(mPixmapItem->pixmap()); // may be newer than the file
+    item->setSelected(isSelected());
+    item->setStyleSheet(isSelected() ? OPERATE_AND_SELECT_STATE : OPERATE_AND_UN_SELECT_STATE);
     return item;
 }
 

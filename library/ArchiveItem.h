@@ -1,7 +1,8 @@
 // One title in the list: its thumbnail over a checker, and the first lines of its texts.
 #pragma once
 
-#include <QFrame>
+#include "touchui/KSBaseItemWidget.h"
+
 #include <QImage>
 #include <QList>
 #include <QPoint>
@@ -14,7 +15,7 @@ class QGraphicsScene;
 class QGraphicsView;
 class QLabel;
 
-class ArchiveItem : public QFrame
+class ArchiveItem : public KSBaseItemWidget
 {
     Q_OBJECT
 
@@ -58,14 +59,11 @@ public:
     void updateLeftChild(QImage image);
     void updateRightChild();
 
-    void setSelected(bool selected) { mSelected = selected; }
-    bool isSelected() const { return mSelected; }
-
     // The lines that are shown, for those who cannot see them.
     QStringList textLines() const;
 
     // An item of a copied record, which the clone owns. The caller owns the clone.
-    ArchiveItem* clone() const;
+    ArchiveItem* clone() override;
 
     // Family of the text lines of all items; items that exist follow with updateRightChild.
     static void setSystemFontFamily(QString family);
@@ -74,6 +72,7 @@ public:
 private:
     void createLeftChild();
     void createRightChild();
+    void placeLine(QLabel* label) const;
     void setTextArea();
     void setOneTextArea(const QString& text);
     void setManyTextArea();
@@ -82,8 +81,6 @@ private:
     Archive* mArchive;
     std::unique_ptr<Archive> mOwnArchive; // only of a clone
     int mType;
-    bool mSelected = false;
-    QGraphicsView* mView = nullptr;
     QGraphicsScene* mScene = nullptr;
     QGraphicsPixmapItem* mPixmapItem = nullptr;
     QWidget* mTextWidget = nullptr;

@@ -23,6 +23,7 @@ namespace
 {
 
 const int ITEMS_IN_VIEW = 6;    // before the list scrolls to the selection
+const int EFFECTIVE_LEFT = 38;  // the scroll bar lies before it
 const int LOADER_POLL = 1;      // ms
 const int LABEL_FONT_SIZE = 13; // points
 
@@ -37,13 +38,16 @@ void sweepTitleFolders()
 } // namespace
 
 ArchiveList::ArchiveList(QLabel* folderLabel, bool autoInit, QWidget* parent)
-    : ArchiveColumn(parent)
+    : KSScrollViewerWidget(parent)
     , mController(std::make_unique<ArchiveController>())
     , mFiles(*mController)
     , mFolderLabel(folderLabel)
     , mMenuFont(QStringLiteral("KST"))
 {
     mMenuFont.setPixelSize(MENU_FONT_SIZE);
+    setScrollBarAutoShow(true);
+    setItemsDragFlagAlignment(DRAGFLAG_RIGHT);
+    setHEffectiveArea(EFFECTIVE_LEFT, ArchiveItem::WIDGET_WIDTH);
     if (mFolderLabel) {
         QFont font = mFolderLabel->font();
         font.setPointSize(LABEL_FONT_SIZE);
@@ -66,10 +70,17 @@ ArchiveList::~ArchiveList()
 
 void ArchiveList::initArchiveListConnect()
 {
-    connect(this, &ArchiveColumn::widgetItemPressed, this, [this] { mLongHold = false; });
-    connect(this, &ArchiveColumn::widgetItemReleased, this, &ArchiveList::itemReleasedEvent);
-    connect(this, &ArchiveColumn::widgetItemLongHold, this, &ArchiveList::itemLongHoldEvent);
-    connect(this, &ArchiveColumn::widgetItemRightPressed, this, &ArchiveList::itemRightPressedEvent);
+    connect(this, &KSScrollViewerWidget::widgetItemPressed, this, [this] { mLongHold = false; });
+    connect(this, &KSScrollViewerWidget::widgetItemReleased, this, &ArchiveList::itemReleasedEvent);
+    connect(this, &KSScrollViewerWidget::widgetItemLongHold, this, &ArchiveList::itemLongHoldEvent);
+    connect(this, &KSScrollViewerWidget::widgetItemPressedAndHold, this,
+            &ArchiveList::itemPressedAndHoldEvent);
+    connect(this, &KSScrollViewerWidget::widgetItemRightPressed, this, &ArchiveList::itemRightPressedEvent);
+    connect(this, &KSScrollViewerWidget::signalFlick, this, &ArchiveList::itemFlickEvent);
+    connect(this, &KSScrollViewerWidget::signalDragOneItem, this, &ArchiveList::slotDragOneItem);
+    connect(this, &KSScrollViewerWidget::signalItemDrop, this, &ArchiveList::slotItemDrop);
+    connect(this, &ArchiveList::signalStartMove, this, &KSScrollViewerWidget::slotStartDrag);
+    connect(this, &ArchiveList::signalItemsCanDrag, this, &KSScrollViewerWidget::slotItemsCanDrag);
     connect(this, &ArchiveList::signalAddArchiveData, this, &ArchiveList::slotAddArchiveData,
             Qt::QueuedConnection);
     connect(this, &ArchiveList::signalAddOneArchiveData, this, &ArchiveList::slotAddOneArchiveData,
@@ -137,8 +148,10 @@ void ArchiveList::getArchiveListSuccessed(QList<Archive*> archivesList)
 void ArchiveList::addRecords(const QList<Archive*>& archives)
 {
     mArchives = archives;
+    QList<KSBaseItemWidget*> items;
     for (Archive* archive : mArchives)
-        addWidgetItem(createBaseItem(archive), -1);
+        items.append(createBaseItem(archive));
+    addWidgetItems(&items, -1);
 }
 
 ArchiveItem* ArchiveList::createBaseItem(Archive* archive)
@@ -159,7 +172,7 @@ ArchiveItem* ArchiveList::createPasteUndoItem(Archive* archive, ArchiveItem* ite
 void ArchiveList::slotAddArchiveData()
 {
     for (int i = 0; i < count(); ++i)
-        emit signalAddOneArchiveData(getWidgetItem(i));
+        emit signalAddOneArchiveData(archiveItem(i));
 }
 
 void ArchiveList::slotAddOneArchiveData(ArchiveItem* item)
@@ -193,6 +206,11 @@ ArchiveItem* ArchiveList::getSelectedArchive() const
     return mSelectedItem;
 }
 
+ArchiveItem* ArchiveList::archiveItem(int index) const
+{
+    return qobject_cast<ArchiveItem*>(getWidgetItem(index));
+}
+
 int ArchiveList::getItemIndex(ArchiveItem* item) const
 {
     return getIndexOfWidgetItem(item);
@@ -209,7 +227,7 @@ ArchiveItem* ArchiveList::findItem(const QString& path) const
 
 void ArchiveList::selectArchive(int index)
 {
-    ArchiveItem* item = getWidgetItem(index);
+    ArchiveItem* item = archiveItem(index);
     if (mSelectedItem != item)
         setDefaultItemState(mSelectedItem);
     if (item) {
@@ -223,7 +241,7 @@ void ArchiveList::selectArchive(int index)
 
 void ArchiveList::selectOperationArchive(int index)
 {
-    if (ArchiveItem* item = getWidgetItem(index)) {
+    if (ArchiveItem* item = archiveItem(index)) {
         if (mOperationItem != item)
             clearOperationItemState(mOperationItem);
         setOperationItemState(item);
@@ -289,14 +307,16 @@ void ArchiveList::moveCurrentArchiveItemVisble()
     if (count() <= ITEMS_IN_VIEW || selected < 0)
         return;
     const int last = lastVisibleItem();
+    const bool isCut = mSelectedItem->geometry().bottom() > calculateVisibleRect().bottom();
     if (selected < firstVisibleItem())
         moveToWidgetItem(selected);
-    else if (selected > last || (selected == last && isCutAtBottom(selected)))
+    else if (selected > last || (selected == last && isCut))
         moveToWidgetItem(selected - ITEMS_IN_VIEW);
 }
 
-void ArchiveList::itemReleasedEvent(ArchiveItem* item, QPoint)
+void ArchiveList::itemReleasedEvent(KSBaseItemWidget* released, QPoint, KSScrollViewerWidget*)
 {
+    auto* item = qobject_cast<ArchiveItem*>(released);
     if (mMoveMode != 0)
         return;
     if (item && !mLongHold) {
@@ -320,7 +340,7 @@ QList<ArchiveOrder*> ArchiveList::getArchiveOrderList() const
     for (int i = 0; i < count(); ++i) {
         auto* order = new ArchiveOrder;
         order->setArchiveIndex(i);
-        order->setArchivePath(QFileInfo(getWidgetItem(i)->getArchiveDataPath()).fileName().toStdString());
+        order->setArchivePath(QFileInfo(archiveItem(i)->getArchiveDataPath()).fileName().toStdString());
         orders.append(order);
     }
     return orders;
@@ -368,9 +388,13 @@ void ArchiveList::resetPositions()
 {
     mSelectedItem.clear();
     mOperationItem.clear();
+    mDraggedItem.clear();
     mOperationPosition = -1;
     mSelectedPosition = -1;
     mPressPosition = -1;
+    mMoveSource = -1;
+    mMoveDestination = -1;
+    mMoving = false;
     mLongHold = false;
 }
 

@@ -1,14 +1,15 @@
 // The column of thumbnails: the titles of the current folder, in the folder's order.
 //
 // A tap selects a title and sends it to the canvas; a right click or a long hold opens the option menu, from
-// which titles are created, copied, pasted and deleted. Every change goes out as an undo command, which the
-// receiver takes over and pushes. The selected item is the title on the canvas, the operation item the one
-// that the menu acts on. GUI thread only.
+// which titles are created, copied, pasted, deleted and saved as templates; in move mode titles are dragged
+// to another place. Every change goes out as an undo command, which the receiver takes over and pushes. The
+// selected item is the title on the canvas, the operation item the one that the menu acts on. GUI thread
+// only.
 #pragma once
 
 #include "document/Archive.h"
-#include "library/ArchiveColumn.h"
 #include "library/TitleFileOperations.h"
+#include "touchui/KSScrollViewerWidget.h"
 
 #include <QFont>
 #include <QImage>
@@ -28,7 +29,7 @@ class QAction;
 class QLabel;
 class QUndoCommand;
 
-class ArchiveList : public ArchiveColumn
+class ArchiveList : public KSScrollViewerWidget
 {
     Q_OBJECT
 
@@ -47,8 +48,11 @@ public:
     ArchiveItem* getSelectedArchive() const;
     bool IsOptionMenuShowing() const;
     int getItemIndex(ArchiveItem* item) const;
-    // 0 off, 1 on.
-    int getMoveState() const { return mMoveMode; }
+    // Null when there is no such item.
+    ArchiveItem* archiveItem(int index) const;
+    bool isMoveMode() const { return mMoveMode != 0; }
+    // Whether an item is being dragged.
+    bool getMoveState() const { return mMoving; }
 
     // Opens the last folder, or else the first one; its titles follow from a thread of their own.
     void initArchiveList();
@@ -99,7 +103,7 @@ signals:
     void focusCommandSignal(QUndoCommand* command);
     void moveCommandSignal(QUndoCommand* command);
     void addUserSignal(QString name);
-    void signalStartMove(ArchiveItem* item);
+    void signalStartMove(KSBaseItemWidget* item);
     void signalItemsCanDrag(bool canDrag);
     void startTemplatePicker();
     void startUserTemplatePicker();
@@ -114,14 +118,20 @@ signals:
 public slots:
     void slotHideOptionMenu();
     void slotMenuAboutToClose();
+    void slotDragOneItem(KSBaseItemWidget* item, int index, KSScrollViewerWidget* scrollArea);
+    void slotItemDrop();
     void moveButtonClicked(bool isMoveMode);
     void slotAddArchiveData();
     void slotAddOneArchiveData(ArchiveItem* item);
     // A title has been saved: reads it again and shows the picture in its item.
     void refreshBaseItem(QString archiveFilePath, QImage leftImage);
-    void itemLongHoldEvent(ArchiveItem* item, QPoint pos);
-    void itemReleasedEvent(ArchiveItem* item, QPoint pos);
-    void itemRightPressedEvent(ArchiveItem* item, QPoint pos);
+    void itemLongHoldEvent(KSBaseItemWidget* item, QPoint pos, KSScrollViewerWidget* scrollArea);
+    void itemReleasedEvent(KSBaseItemWidget* item, QPoint pos, KSScrollViewerWidget* scrollArea);
+    void itemPressedAndHoldEvent(KSBaseItemWidget* item, QPoint pos, KSScrollViewerWidget* scrollArea,
+                                 bool& willMenuPopup);
+    void itemRightPressedEvent(KSBaseItemWidget* item, QPoint pos, KSScrollViewerWidget* scrollArea);
+    void itemFlickEvent(KSBaseItemWidget* item, QPoint pos, KSScrollViewerWidget* scrollArea,
+                        bool& willFlick);
     void selectOptionMenuItem(QAction* action);
     // Makes a title from the template's record, behind the operation item.
     void createArchiveFromTemplate(Archive* temp);
@@ -146,7 +156,7 @@ private:
     void setFolderLabel();
     void addRecords(const QList<Archive*>& archives);
     void offerTemplateOrReportFull();
-    void showOptionMenu(ArchiveItem* item, QPoint pos);
+    void showOptionMenu(KSBaseItemWidget* item, QPoint pos, KSScrollViewerWidget* scrollArea);
     void createOptionMenu();
     // Sibling processes know that a popup is open, and a press in one of them closes it.
     void sendTitlerAppEvent(bool open);
@@ -154,6 +164,9 @@ private:
     void exeCopyArchive();
     void exePasteArchive();
     void exeDeleteArchive();
+    void exeAddUserArchive();
+    // Blocks until the canvas has written the title out.
+    void waitForCanvas();
     void emitPasteCommand(std::unique_ptr<Archive> archive);
     ArchiveItem* findItem(const QString& path) const;
 
@@ -163,7 +176,7 @@ private:
     bool mIgnoreLoaded = false; // a loader that is being ended may still deliver
     std::unique_ptr<ArchiveMenu> mMenu;
     QList<Archive*> mArchives;     // owned
-    QList<ArchiveItem*> mAllItems; // listed or held by an undo command; owned by the column
+    QList<ArchiveItem*> mAllItems; // listed or held by an undo command; children of the list
     std::unique_ptr<Archive> mCopyArchive;
     TitlePictures mCopyPictures;
     QLabel* mFolderLabel;
@@ -173,9 +186,13 @@ private:
     QFont mMenuFont;
     QPointer<ArchiveItem> mSelectedItem;
     QPointer<ArchiveItem> mOperationItem;
+    QPointer<ArchiveItem> mDraggedItem;
     int mOperationPosition = -1;
     int mSelectedPosition = -1;
     int mPressPosition = -1;
-    int mMoveMode = 0;
+    int mMoveSource = -1;
+    int mMoveDestination = -1;
+    int mMoveMode = 0; // 1 while titles can be dragged
+    bool mMoving = false;
     bool mLongHold = false; // the release of the finger that opened the menu selects nothing
 };

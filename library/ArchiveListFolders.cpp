@@ -58,8 +58,8 @@ void ArchiveList::refreshArchiveListInFile(QString path, QString fileName)
     ArchiveItem* wanted = nullptr;
     const QString filePath = path + QLatin1Char('/') + fileName;
     for (int i = 0; i < count() && !wanted; ++i) {
-        if (getWidgetItem(i)->getArchiveDataPath() == filePath)
-            wanted = getWidgetItem(i);
+        if (archiveItem(i)->getArchiveDataPath() == filePath)
+            wanted = archiveItem(i);
     }
     if (wanted)
         selectArchive(getItemIndex(wanted));

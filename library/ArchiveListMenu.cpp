@@ -1,5 +1,7 @@
 // What the operator does to titles through the option menu of the list.
+#include "canvas/CanvasScene.h"
 #include "document/Archive.h"
+#include "document/ArchiveController.h"
 #include "library/ArchiveItem.h"
 #include "library/ArchiveList.h"
 #include "library/ArchiveMenu.h"
@@ -7,13 +9,17 @@
 #include "library/IEditContext.h"
 #include "library/ListMessages.h"
 #include "library/PasteArchiveCommand.h"
+#include "library/TitleReports.h"
+#include "support/IPathManagerEx.h"
 #include "support/LogManager.h"
 #include "support/SystemInfo.h"
 #include "touchui/ITitlerAPPEventFilterController.h"
 
+#include <QFileInfo>
 #include <QLabel>
 #include <QWheelEvent>
 #include <string>
+#include <unistd.h>
 
 namespace
 {
@@ -48,18 +54,19 @@ bool ArchiveList::checkDiskSpaceIsFull() const
            LIMIT_REMAIN * KB_MILLION;
 }
 
-void ArchiveList::itemLongHoldEvent(ArchiveItem* item, QPoint pos)
+void ArchiveList::itemLongHoldEvent(KSBaseItemWidget* item, QPoint pos, KSScrollViewerWidget* scrollArea)
 {
     if (mMoveMode != 0)
         return;
     mLongHold = true;
-    showOptionMenu(item, pos);
+    showOptionMenu(item, pos, scrollArea);
+    setFlickAbility(false);
 }
 
-void ArchiveList::itemRightPressedEvent(ArchiveItem* item, QPoint pos)
+void ArchiveList::itemRightPressedEvent(KSBaseItemWidget* item, QPoint pos, KSScrollViewerWidget* scrollArea)
 {
     if (mMoveMode == 0)
-        showOptionMenu(item, pos);
+        showOptionMenu(item, pos, scrollArea);
 }
 
 void ArchiveList::createOptionMenu()
@@ -68,13 +75,13 @@ void ArchiveList::createOptionMenu()
         return;
     mMenu = std::make_unique<ArchiveMenu>(this);
     connect(mMenu.get(), &QMenu::triggered, this, &ArchiveList::selectOptionMenuItem);
-    connect(mMenu.get(), &ArchiveMenu::signalMenuAboutToClose, this, &ArchiveList::slotMenuAboutToClose);
+    connect(mMenu.get(), &KSMenu::signalMenuAboutToClose, this, &ArchiveList::slotMenuAboutToClose);
 }
 
-void ArchiveList::showOptionMenu(ArchiveItem* item, QPoint pos)
+void ArchiveList::showOptionMenu(KSBaseItemWidget* pressed, QPoint pos, KSScrollViewerWidget* scrollArea)
 {
     createOptionMenu();
-    const bool hasCopy = mCopyArchive != nullptr;
+    auto* item = qobject_cast<ArchiveItem*>(pressed);
     if (item) {
         mOperationPosition = getItemIndex(item);
         mPressPosition = mOperationPosition;
@@ -83,14 +90,14 @@ void ArchiveList::showOptionMenu(ArchiveItem* item, QPoint pos)
     } else {
         mOperationPosition = count() - 1;
     }
-    mMenu->enableFor(item != nullptr, hasCopy);
+    mMenu->enableFor(item != nullptr, mCopyArchive != nullptr);
     mMenu->setFont(mMenuFont);
 
-    QPoint anchor = item ? item->mapToGlobal(pos) : mapToGlobal(pos);
     // In the lower part of the list the menu opens upwards, so that it stays on the screen.
-    const int upperPart = 4 * (height() / 7);
-    if (mapFromGlobal(anchor).y() >= upperPart)
-        anchor.ry() -= mMenu->sizeHint().height();
+    const QPoint anchor = item ? item->mapToGlobal(pos) : scrollArea->mapToGlobal(pos);
+    const QRect upper(QPoint(0, 0), QPoint(width(), 4 * (height() / 7) - 1));
+    mMenu->setBalloonAlignment(upper.contains(mapFromGlobal(anchor)) ? MenuPlacement::Below
+                                                                     : MenuPlacement::Above);
     mMenu->popup(anchor);
     sendTitlerAppEvent(true);
     emit archiveListMenuShow();
@@ -117,7 +124,7 @@ void ArchiveList::slotHideOptionMenu()
 {
     if (!IsOptionMenuShowing())
         return;
-    mMenu->hide();
+    mMenu->close();
     sendTitlerAppEvent(false);
 }
 
@@ -130,15 +137,7 @@ void ArchiveList::slotMenuAboutToClose()
 void ArchiveList::wheelEvent(QWheelEvent* event)
 {
     slotHideOptionMenu();
-    ArchiveColumn::wheelEvent(event);
-}
-
-void ArchiveList::moveButtonClicked(bool isMoveMode)
-{
-    mMoveMode = isMoveMode ? 1 : 0;
-    emit signalItemsCanDrag(isMoveMode);
-    if (!isMoveMode)
-        clearOperationItemState(mOperationItem);
+    KSScrollViewerWidget::wheelEvent(event);
 }
 
 void ArchiveList::selectOptionMenuItem(QAction* action)
@@ -164,7 +163,8 @@ void ArchiveList::selectOptionMenuItem(QAction* action)
         exeDeleteArchive();
         break;
     case ArchiveAction::ACTION_ADD_USER:
-        break; // never enabled, see ArchiveMenu::enableFor
+        exeAddUserArchive();
+        break;
     }
 }
 
@@ -248,13 +248,49 @@ void ArchiveList::exeDeleteArchive()
         new DeleteArchiveCommand(this, mOperationItem, position, mOperationItem == mSelectedItem));
 }
 
+void ArchiveList::exeAddUserArchive()
+{
+    if (!mOperationItem || !mOperationItem->getArchiveData())
+        return;
+    const QString root = QString::fromStdWString(IPathManagerEx::getInstance()->getTitlerTemplatesPath());
+    const QString name = mController->getFreeNameInUserTemplate(root);
+    const auto templates = static_cast<int>(mController->getFileOrder(root).size());
+    if (templates > ListMessages::TEMPLATE_LIMIT || name.isEmpty()) {
+        ListMessages::post(MessageDef::MESSAGE_TEMPLATE_LIST_FULL, name);
+        return;
+    }
+    if (checkDiskSpaceIsFull()) {
+        ListMessages::post(MessageDef::MESSAGE_DISK_FULL_ON_TEMPLATE, name);
+        return;
+    }
+    if (mSelectedItem && mSelectedItem == mOperationItem)
+        waitForCanvas();
+    const Archive source(*mOperationItem->getArchiveData());
+    const std::unique_ptr<Archive> target = mFiles.createUserTemplate(root, name, source);
+    if (!target)
+        return;
+    TitleReports::titleChanged(FileManagerDefine::TITLE_TEMPLATE_ADDED,
+                               QFileInfo(QString::fromStdString(target->getPath())).path());
+    emit addUserSignal(QFileInfo(QString::fromStdString(target->getName())).path());
+    emit startUserTemplatePicker();
+}
+
+// The title on the canvas must have been written out before it can be copied. It stays selected.
+void ArchiveList::waitForCanvas()
+{
+    setDefaultItemState(mSelectedItem);
+    while (mMainScene && !mMainScene->isEditFinish())
+        ::sleep(1);
+    setSelectItemState(mSelectedItem);
+}
+
 void ArchiveList::setSystemLanFont(QString family)
 {
     mMenuFont = QFont(family);
     mMenuFont.setPixelSize(MENU_FONT_SIZE);
     ArchiveItem::setSystemFontFamily(family);
     for (int i = 0; i < count(); ++i)
-        getWidgetItem(i)->updateRightChild();
+        archiveItem(i)->updateRightChild();
 }
 
 void ArchiveList::translateText()

@@ -1,12 +1,7 @@
 #include "library/ArchiveMenu.h"
 
-ArchiveMenu::ArchiveMenu(QWidget* parent) : QMenu(parent)
+ArchiveMenu::ArchiveMenu(QWidget* parent) : KSMenu(parent)
 {
-    setStyleSheet(QStringLiteral(
-        "QMenu { background-color: rgb(50, 50, 50); border: 1px solid rgb(102, 102, 102); padding: 6px; }"
-        "QMenu::item { color: rgb(220, 220, 220); padding: 12px 28px; min-width: 250px; }"
-        "QMenu::item:disabled { color: rgb(102, 102, 102); }"
-        "QMenu::item:selected:enabled { background-color: rgb(0, 129, 255); }"));
     for (ArchiveAction::ARCHIVE_ACTION_TYPE type :
          {ArchiveAction::ACTION_CREATE, ArchiveAction::ACTION_COPY, ArchiveAction::ACTION_PASTE,
           ArchiveAction::ACTION_DELETE, ArchiveAction::ACTION_ADD_USER}) {
@@ -15,7 +10,6 @@ ArchiveMenu::ArchiveMenu(QWidget* parent) : QMenu(parent)
         addAction(entry);
     }
     translateText();
-    connect(this, &QMenu::aboutToHide, this, &ArchiveMenu::signalMenuAboutToClose);
 }
 
 void ArchiveMenu::translateText()
@@ -33,8 +27,7 @@ void ArchiveMenu::enableFor(bool onItem, bool hasCopy)
     action(ArchiveAction::ACTION_COPY)->setEnabled(onItem);
     action(ArchiveAction::ACTION_PASTE)->setEnabled(hasCopy);
     action(ArchiveAction::ACTION_DELETE)->setEnabled(onItem);
-    // There is no store of user templates yet.
-    action(ArchiveAction::ACTION_ADD_USER)->setEnabled(false);
+    action(ArchiveAction::ACTION_ADD_USER)->setEnabled(onItem);
 }
 
 ArchiveAction* ArchiveMenu::action(ArchiveAction::ARCHIVE_ACTION_TYPE type) const

@@ -2,11 +2,11 @@
 #pragma once
 
 #include "library/ArchiveAction.h"
+#include "touchui/KSMenu.h"
 
 #include <QList>
-#include <QMenu>
 
-class ArchiveMenu : public QMenu
+class ArchiveMenu : public KSMenu
 {
     Q_OBJECT
 
@@ -20,9 +20,6 @@ public:
     void enableFor(bool onItem, bool hasCopy);
 
     ArchiveAction* action(ArchiveAction::ARCHIVE_ACTION_TYPE type) const;
-
-signals:
-    void signalMenuAboutToClose();
 
 private:
     QList<ArchiveAction*> mActions; // owned by this menu as their parent

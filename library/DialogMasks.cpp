@@ -29,6 +29,8 @@ DialogMasks::DialogMasks(QWidget* owner, const QRect& area) : mOwner(owner), mAr
 
 void DialogMasks::setShown(QWidget*& mask, bool show)
 {
+    if (!mask && !show)
+        return;
     if (!mask)
         mask = createMask(mOwner, mArea);
     mask->setVisible(show);

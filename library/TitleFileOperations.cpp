@@ -5,6 +5,7 @@
 #include "library/TitlerUtility.h"
 #include "support/AtomicFile.h"
 #include "support/LogManager.h"
+#include "support/SystemInfo.h"
 
 #include <QDir>
 #include <QFile>
@@ -19,6 +20,7 @@ const QString TitleFileOperations::THUMBNAIL_SOURCE = QStringLiteral("_240");
 const QString TitleFileOperations::BG_SOURCE = QStringLiteral("_source_1280");
 const QString TitleFileOperations::BG_SOURCE_BIG = QStringLiteral("_source_1920");
 const QString TitleFileOperations::XML_EXTENSION = QStringLiteral(".xml");
+const QString TitleFileOperations::TEMPLATE_STEM = QStringLiteral("Titler");
 
 namespace
 {
@@ -141,4 +143,35 @@ std::unique_ptr<Archive> TitleFileOperations::createFromCopy(const QString& fold
     if (!mController.saveNewArchive(folder, archive.get()))
         return nullptr;
     return archive;
+}
+
+std::unique_ptr<Archive> TitleFileOperations::createUserTemplate(const QString& root, const QString& name,
+                                                                 const Archive& source) const
+{
+    if (root.isEmpty() || name.isEmpty())
+        return nullptr;
+    const QString folder = root + QLatin1Char('/') + name;
+    if (!SystemInfo::createFolders(folder.toStdWString()))
+        LOG_EVENT(L"ArchiveList", __LINE__, L"ERROR create dir.", 4);
+
+    auto target = std::make_unique<Archive>(source);
+    target->setName((name + QLatin1Char('/') + TEMPLATE_STEM).toStdString());
+    target->setPath((folder + QLatin1Char('/') + TEMPLATE_STEM + XML_EXTENSION).toStdString());
+    const QString extension = extensionOf(source.getThumbnailSmall());
+    if (extension.isEmpty()) {
+        LOG_EVENT(L"ArchiveList", __LINE__, L"small thumbnail without an extension", 4);
+    } else {
+        target->setThumbnailSmall((TEMPLATE_STEM + THUMBNAIL_SOURCE + extension).toStdString());
+        writePicture(*target, target->getThumbnailSmall(), readPicture(source.getFullPathOfThumbnailSmall()));
+        // The background becomes the template's own, also where it was that of a preset.
+        if (!source.getBgResource().empty())
+            target->setBgResource((TEMPLATE_STEM + BG_SOURCE + extension).toStdString());
+        if (!source.getBgResourceBig().empty())
+            target->setBgResourceBig((TEMPLATE_STEM + BG_SOURCE_BIG + extension).toStdString());
+        Archive from(source);
+        mController.copyArchiveBg(&from, target.get());
+    }
+    if (!mController.saveNewArchive(root, target.get()))
+        return nullptr;
+    return target;
 }

@@ -1,5 +1,5 @@
-// Makes the files of a new title in a folder: from a template, or from a copy held in memory.
-// Has no widgets. GUI thread; nothing here waits for the disk to have written.
+// Makes the files of a new title in a folder, from a template or from a copy held in memory, and those of a
+// user template. Has no widgets. GUI thread; nothing here waits for the disk to have written.
 #pragma once
 
 #include <QByteArray>
@@ -30,6 +30,7 @@ public:
     static const QString BG_SOURCE;
     static const QString BG_SOURCE_BIG;
     static const QString XML_EXTENSION;
+    static const QString TEMPLATE_STEM; // of the files of a user template
 
     // The controller is not owned and must outlive this object.
     explicit TitleFileOperations(ArchiveController& controller);
@@ -48,6 +49,12 @@ public:
     // the title file. Null as above.
     std::unique_ptr<Archive> createFromCopy(const QString& folder, const Archive& copy,
                                             const TitlePictures& pictures) const;
+
+    // Makes the folder of a user template of this name in the root and in it the title file, with copies of
+    // the small picture and the background. The record's name is "<name>/Titler". Null when the title file is
+    // refused.
+    std::unique_ptr<Archive> createUserTemplate(const QString& root, const QString& name,
+                                                const Archive& source) const;
 
 private:
     void renameRecord(Archive& archive, const QString& folder) const;

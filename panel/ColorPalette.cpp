@@ -30,6 +30,7 @@ constexpr int ANSWERS_TOP = 275;
 constexpr int ANSWER_SPACING = 20;
 constexpr QColor MASK_COLOR(0, 0, 0, 166);
 constexpr QColor FOCUS_COLOR(0, 129, 255);
+constexpr QColor CORNER_COLOR(30, 30, 30); // beside the round corners of the frame
 constexpr int FOCUS_MARGIN = 3;
 
 const char REST_STYLE[] = "border: 1px solid white; width:53px; height:48px;border-radius:2px;";
@@ -212,6 +213,7 @@ void ColorPalette::paintEvent(QPaintEvent*)
 {
     QPainter painter(this);
     painter.setRenderHint(QPainter::SmoothPixmapTransform);
+    painter.fillRect(rect(), CORNER_COLOR);
     painter.drawPixmap(rect(), m_background);
     drawHorizontalLine(painter, TOPLINE_RECT);
     drawHorizontalLine(painter, BOTTOMLINE_RECT);

@@ -24,7 +24,7 @@ const char LABEL_STYLE[] = "QLabel {color:rgb(220, 220, 220); font:20px;}";
 
 EdgeSizeSlider::EdgeSizeSlider(QWidget* parent)
     : QMenu(parent)
-    , m_frame(SliceFrame::family(QStringLiteral(":/Dialog/dialog_base_"), QStringLiteral("bottom")))
+    , m_frame(SliceFrame::family(QStringLiteral(":/Dialog/dialog_base_")))
     , m_outsidePress(new OutsidePressFilter(this, this))
 {
     setWindowFlags(Qt::ToolTip | Qt::FramelessWindowHint | Qt::NoDropShadowWindowHint |

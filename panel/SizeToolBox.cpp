@@ -4,7 +4,7 @@
 #include "canvas/TextObjectConstants.h"
 #include "panel/ComboxLineEditRegExpValidator.h"
 #include "panel/SizeBoxLineEdit.h"
-#include "touchui/KSCombobox.h"
+#include "panel/SizeCombox.h"
 #include "touchui/KSInputContext.h"
 #include "touchui/KSPushbutton.h"
 
@@ -60,7 +60,7 @@ SizeToolBox::SizeToolBox(QWidget* parent) : ToolBox(parent)
 
 void SizeToolBox::createBox()
 {
-    m_box = new KSCombobox(this);
+    m_box = new SizeCombox(this);
     m_box->setObjectName(QStringLiteral("SizeBox"));
     m_box->setFixedSize(COMBOBOX_WIDTH, WIDGET_HEIGHT);
     m_box->setBackgroundImagesPath(QString::fromLatin1(BOX_IMAGES));

@@ -15,6 +15,12 @@ namespace
 {
 
 constexpr FlickMotion::Rules RULES = FlickMotion::treeView();
+// Without arrows: the bar is all track and handle.
+const char LIST_STYLE[] = "QListView { background: transparent; border: 0px; }"
+                          "QScrollBar { margin: 0px; border: 0px; background-color: rgb(51, 51, 51) }"
+                          "QScrollBar:vertical { width: 32px }"
+                          "QScrollBar::add-line, QScrollBar::sub-line { width: 0px; height: 0px }"
+                          "QScrollBar::handle:vertical { min-height: 42px }";
 
 } // namespace
 
@@ -30,7 +36,7 @@ CustomComboBoxView::CustomComboBoxView(QWidget* parent)
     setSelectionMode(QAbstractItemView::SingleSelection);
     setFocusPolicy(Qt::NoFocus);
     setUniformItemSizes(true);
-    setStyleSheet(QStringLiteral("QListView { background: transparent; border: 0px; }"));
+    setStyleSheet(QString::fromLatin1(LIST_STYLE));
 }
 
 CustomComboBoxView::~CustomComboBoxView()

@@ -4,31 +4,31 @@
 <context>
     <name>ArchiveList</name>
     <message>
-        <source>Folder</source>
-        <translation>文件夹</translation>
-    </message>
-    <message>
         <source>File</source>
         <translation>文件</translation>
+    </message>
+    <message>
+        <source>Folder</source>
+        <translation>文件夹</translation>
     </message>
 </context>
 <context>
     <name>ArchiveMenu</name>
     <message>
-        <source>Create New</source>
-        <translation>新建</translation>
-    </message>
-    <message>
         <source>Copy</source>
         <translation>复制</translation>
     </message>
     <message>
-        <source>Paste</source>
-        <translation>粘贴</translation>
+        <source>Create New</source>
+        <translation>新建</translation>
     </message>
     <message>
         <source>Delete</source>
         <translation>删除</translation>
+    </message>
+    <message>
+        <source>Paste</source>
+        <translation>粘贴</translation>
     </message>
     <message>
         <source>Save as Template</source>
@@ -45,12 +45,12 @@
 <context>
     <name>CanvasScene</name>
     <message>
-        <source>Title goes here</source>
-        <translation>在此输入标题</translation>
-    </message>
-    <message>
         <source>Text Input</source>
         <translation>文本输入</translation>
+    </message>
+    <message>
+        <source>Title goes here</source>
+        <translation>在此输入标题</translation>
     </message>
 </context>
 <context>
@@ -96,12 +96,12 @@
 <context>
     <name>FolderPicker</name>
     <message>
-        <source>Untitled</source>
-        <translation>未命名</translation>
+        <source>Cancel</source>
+        <translation>取消</translation>
     </message>
     <message>
-        <source>folder</source>
-        <translation>文件夹</translation>
+        <source>Duplicate</source>
+        <translation>复制</translation>
     </message>
     <message>
         <source>File</source>
@@ -112,10 +112,6 @@
         <translation>文件夹名称</translation>
     </message>
     <message>
-        <source>Duplicate</source>
-        <translation>复制</translation>
-    </message>
-    <message>
         <source>New Folder</source>
         <translation>新建文件夹</translation>
     </message>
@@ -124,8 +120,12 @@
         <translation>打开</translation>
     </message>
     <message>
-        <source>Cancel</source>
-        <translation>取消</translation>
+        <source>Untitled</source>
+        <translation>未命名</translation>
+    </message>
+    <message>
+        <source>folder</source>
+        <translation>文件夹</translation>
     </message>
     <message>
         <source>Select Folder</source>
@@ -153,12 +153,12 @@
 <context>
     <name>GraphicsText</name>
     <message>
-        <source>Title goes here</source>
-        <translation>在此输入标题</translation>
-    </message>
-    <message>
         <source>Text Input</source>
         <translation>文本输入</translation>
+    </message>
+    <message>
+        <source>Title goes here</source>
+        <translation>在此输入标题</translation>
     </message>
 </context>
 <context>
@@ -203,6 +203,41 @@
     <message>
         <source>Font Size</source>
         <translation>字体大小</translation>
+    </message>
+</context>
+<context>
+    <name>TemplatePicker</name>
+    <message>
+        <source>Templates</source>
+        <translation>模板</translation>
+    </message>
+    <message>
+        <source>Preset</source>
+        <translation>预设</translation>
+    </message>
+    <message>
+        <source>User</source>
+        <translation>用户</translation>
+    </message>
+    <message>
+        <source>File Name</source>
+        <translation>文件名</translation>
+    </message>
+    <message>
+        <source>Text</source>
+        <translation>文本</translation>
+    </message>
+    <message>
+        <source>Select</source>
+        <translation>选择</translation>
+    </message>
+    <message>
+        <source>Delete</source>
+        <translation>删除</translation>
+    </message>
+    <message>
+        <source>Cancel</source>
+        <translation>取消</translation>
     </message>
 </context>
 <context>
@@ -265,6 +300,29 @@
     <message>
         <source>Checker</source>
         <translation>棋盘格</translation>
+    </message>
+</context>
+<context>
+    <name>UserTemplateMenu</name>
+    <message>
+        <source>Create New</source>
+        <translation>新建</translation>
+    </message>
+    <message>
+        <source>Copy</source>
+        <translation>复制</translation>
+    </message>
+    <message>
+        <source>Paste</source>
+        <translation>粘贴</translation>
+    </message>
+    <message>
+        <source>Delete</source>
+        <translation>删除</translation>
+    </message>
+    <message>
+        <source>Add Template</source>
+        <translation>添加模板</translation>
     </message>
 </context>
 </TS>

@@ -4,31 +4,31 @@
 <context>
     <name>ArchiveList</name>
     <message>
-        <source>Folder</source>
-        <translation>Folder</translation>
-    </message>
-    <message>
         <source>File</source>
         <translation>File</translation>
+    </message>
+    <message>
+        <source>Folder</source>
+        <translation>Folder</translation>
     </message>
 </context>
 <context>
     <name>ArchiveMenu</name>
     <message>
-        <source>Create New</source>
-        <translation>Create New</translation>
-    </message>
-    <message>
         <source>Copy</source>
         <translation>Copy</translation>
     </message>
     <message>
-        <source>Paste</source>
-        <translation>Paste</translation>
+        <source>Create New</source>
+        <translation>Create New</translation>
     </message>
     <message>
         <source>Delete</source>
         <translation>Delete</translation>
+    </message>
+    <message>
+        <source>Paste</source>
+        <translation>Paste</translation>
     </message>
     <message>
         <source>Save as Template</source>
@@ -45,12 +45,12 @@
 <context>
     <name>CanvasScene</name>
     <message>
-        <source>Title goes here</source>
-        <translation>Title goes here</translation>
-    </message>
-    <message>
         <source>Text Input</source>
         <translation>Text Input</translation>
+    </message>
+    <message>
+        <source>Title goes here</source>
+        <translation>Title goes here</translation>
     </message>
 </context>
 <context>
@@ -96,12 +96,12 @@
 <context>
     <name>FolderPicker</name>
     <message>
-        <source>Untitled</source>
-        <translation>Untitled</translation>
+        <source>Cancel</source>
+        <translation>Cancel</translation>
     </message>
     <message>
-        <source>folder</source>
-        <translation>folder</translation>
+        <source>Duplicate</source>
+        <translation>Duplicate</translation>
     </message>
     <message>
         <source>File</source>
@@ -112,10 +112,6 @@
         <translation>Folder Name</translation>
     </message>
     <message>
-        <source>Duplicate</source>
-        <translation>Duplicate</translation>
-    </message>
-    <message>
         <source>New Folder</source>
         <translation>New Folder</translation>
     </message>
@@ -124,8 +120,12 @@
         <translation>Open</translation>
     </message>
     <message>
-        <source>Cancel</source>
-        <translation>Cancel</translation>
+        <source>Untitled</source>
+        <translation>Untitled</translation>
+    </message>
+    <message>
+        <source>folder</source>
+        <translation>folder</translation>
     </message>
     <message>
         <source>Select Folder</source>
@@ -153,12 +153,12 @@
 <context>
     <name>GraphicsText</name>
     <message>
-        <source>Title goes here</source>
-        <translation>Title goes here</translation>
-    </message>
-    <message>
         <source>Text Input</source>
         <translation>Text Input</translation>
+    </message>
+    <message>
+        <source>Title goes here</source>
+        <translation>Title goes here</translation>
     </message>
 </context>
 <context>
@@ -203,6 +203,41 @@
     <message>
         <source>Font Size</source>
         <translation>Font Size</translation>
+    </message>
+</context>
+<context>
+    <name>TemplatePicker</name>
+    <message>
+        <source>Templates</source>
+        <translation>Templates</translation>
+    </message>
+    <message>
+        <source>Preset</source>
+        <translation>Preset</translation>
+    </message>
+    <message>
+        <source>User</source>
+        <translation>User</translation>
+    </message>
+    <message>
+        <source>File Name</source>
+        <translation>File Name</translation>
+    </message>
+    <message>
+        <source>Text</source>
+        <translation>Text</translation>
+    </message>
+    <message>
+        <source>Select</source>
+        <translation>Select</translation>
+    </message>
+    <message>
+        <source>Delete</source>
+        <translation>Delete</translation>
+    </message>
+    <message>
+        <source>Cancel</source>
+        <translation>Cancel</translation>
     </message>
 </context>
 <context>
@@ -265,6 +300,29 @@
     <message>
         <source>Checker</source>
         <translation>Checker</translation>
+    </message>
+</context>
+<context>
+    <name>UserTemplateMenu</name>
+    <message>
+        <source>Create New</source>
+        <translation>Create New</translation>
+    </message>
+    <message>
+        <source>Copy</source>
+        <translation>Copy</translation>
+    </message>
+    <message>
+        <source>Paste</source>
+        <translation>Paste</translation>
+    </message>
+    <message>
+        <source>Delete</source>
+        <translation>Delete</translation>
+    </message>
+    <message>
+        <source>Add Template</source>
+        <translation>Add Template</translation>
     </message>
 </context>
 </TS>

@@ -32,6 +32,16 @@ CANVAS = (609, 97, 1280, 720)
 TOP_WINDOW_MAIN = 2
 LIST_POINT = (380, 130)
 LIST_ROW = 143
+# The option menu opens under the point that was pressed: from there to the middle of its first entry, and on.
+LIST_MENU_ENTRIES = ["Create New", "Copy", "Paste", "Delete", "Save as Template"]
+LIST_MENU_TOP = 50
+LIST_MENU_ROW = 60
+# The template picker: the middle of its first template, the way to the next one, its columns and its buttons.
+TEMPLATE_POINT = (431, 324)
+TEMPLATE_STEP = (258, 153)
+TEMPLATE_COLUMNS = 4
+TEMPLATE_TABS = {"Preset": (356, 216), "User": (475, 216)}
+TEMPLATE_BUTTONS = {"Select": (1285, 907), "Cancel": (1514, 907), "Delete": (1491, 829)}
 # The folder picker: the middle of its first row and of its buttons.
 PICKER_ROW = (800, 306)
 PICKER_ROW_HEIGHT = 48
@@ -108,7 +118,6 @@ class TitlerTest(unittest.TestCase):
         self.appliance = None
         self.titler = None
         self.programs = []
-        self.copied = False
         self.base = self.provision()
         self.display = self.display_class(os.path.join(self.work, "x"), self.environment)
         self.addCleanup(self.display.stop)
@@ -270,15 +279,35 @@ class TitlerTest(unittest.TestCase):
             20 * SLOW, start, "the end of the session")
 
     def choose_in_list_menu(self, row, entry):
-        """Opens the option menu of the title in this row by a right click and chooses an entry by keys."""
-        x, y = LIST_POINT
-        self.click(x, y + row * LIST_ROW, button=3)
+        """Opens the option menu of the title in this row, one of the upper ones, by a right click and chooses."""
+        x, y = LIST_POINT[0], LIST_POINT[1] + row * LIST_ROW
+        self.click(x, y, button=3)
         self.display.wait_until_still()
-        # The keys step over entries that are disabled: without a copy there is nothing to paste.
-        entries = ["Create New", "Copy", "Paste", "Delete"] if self.copied else ["Create New", "Copy", "Delete"]
-        self.display.xdotool("key", "--delay", "60", *["Down"] * (entries.index(entry) + 1), "Return")
-        self.copied = self.copied or entry == "Copy"
+        self.click(x, y + LIST_MENU_TOP + LIST_MENU_ENTRIES.index(entry) * LIST_MENU_ROW)
         self.display.wait_until_still()
+
+    def point_at_template(self, number, tab="Preset"):
+        """In the open template picker, turns to the tab and chooses a template of the first rows."""
+        self.click(*TEMPLATE_TABS[tab])
+        self.display.wait_until_still()
+        row, column = divmod(number, TEMPLATE_COLUMNS)
+        self.click(TEMPLATE_POINT[0] + column * TEMPLATE_STEP[0], TEMPLATE_POINT[1] + row * TEMPLATE_STEP[1])
+        self.display.wait_until_still()
+
+    def choose_template(self, number, tab="Preset"):
+        """Takes a template of the open picker, which closes it."""
+        self.point_at_template(number, tab)
+        self.click(*TEMPLATE_BUTTONS["Select"])
+        self.display.wait_until_still()
+
+    def create_in_list(self, row, template=0):
+        """Begins a new title after the one in this row."""
+        self.choose_in_list_menu(row, "Create New")
+        self.choose_template(template)
+
+    def preset_templates(self, language="en"):
+        """The preset templates in the order in which the picker shows them."""
+        return self.titles(os.path.join(self.base, "resources", "Templates", "templates_" + language))
 
     def wait_titles(self, folder, count, timeout=20):
         session.wait_until(lambda: len(self.titles(folder)) == count, timeout * SLOW, f"{count} titles in {folder}")

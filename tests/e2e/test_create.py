@@ -9,13 +9,14 @@ CALL_TYPE = 7
 
 
 class CreateTitles(harness.TitlerTest):
-    def open_for_creation(self, folder):
-        """Asks for new titles and chooses the folder, in which the first new title is made at once."""
+    def open_for_creation(self, folder, template=1):
+        """Asks for new titles and chooses the folder and the template of the first new title."""
         self.command("register")
         self.command(f"create {CALL_TYPE}")
         self.wait_shown()
         count = len(self.titles(folder))
         self.choose_folder(os.path.basename(folder))
+        self.choose_template(template)
         self.wait_titles(folder, count + 1)
         self.display.wait_until_still()
 
@@ -25,9 +26,8 @@ class CreateTitles(harness.TitlerTest):
         start = self.appliance.mark()
         self.open_for_creation(folder)
         # The second is made above the first, so the folder's order is not the order of making.
-        count = len(self.titles(folder))
-        self.choose_in_list_menu(0, "Create New")
-        self.wait_titles(folder, count + 1)
+        self.create_in_list(0, template=0)
+        self.wait_titles(folder, len(old) + 2)
         self.close_window()
 
         result = self.wait_result(start)
@@ -41,10 +41,30 @@ class CreateTitles(harness.TitlerTest):
         self.assertEqual(result["paths"], names)
         self.assertEqual(result["count"], 2)
         self.assertEqual(result["size"], sum(self.packed_size(name) for name in names))
-        for path in new:
+        templates = self.preset_templates()
+        # The upper one was made last, from the first template.
+        for path, template in zip(new, templates):
             title = harness.Title(path)
-            self.assertTrue(os.path.exists(path))
+            self.assertEqual(title.texts(), template.texts())
             self.assert_pictures_have_their_sizes(title)
+
+    def test_a_cancelled_picker_makes_no_title(self):
+        folder = self.folder(FOLDER)
+        old = [title.path for title in self.titles(folder)]
+        self.open_title(self.titles(folder)[0])
+        before = self.display.grab()
+        self.choose_in_list_menu(0, "Create New")
+        self.point_at_template(3)
+        picker = self.display.grab()
+        self.assertNotEqual(picker, before)
+        # The rest of the window is out of reach meanwhile.
+        self.click_tool("Close")
+        self.display.wait_until_still()
+        self.assertTrue(self.window())
+        self.click(*harness.TEMPLATE_BUTTONS["Cancel"])
+        harness.session.wait_until(lambda: self.display.grab() != picker, 20 * harness.SLOW, "the picker to go")
+        self.close_window()
+        self.assertEqual([title.path for title in self.titles(folder)], old)
 
     def test_no_folder_is_chosen(self):
         before = {name: self.titles(self.folder(name)) for name in self.folders()}

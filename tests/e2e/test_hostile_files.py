@@ -181,6 +181,7 @@ class TitleFolders(harness.TitlerTest):
                 self.command(f'edit "{folder}"')
                 self.wait_shown()
                 # With nothing in the list a new title is begun, and the order is written anew with it.
+                self.choose_template(7)
                 self.close_window()
                 self.assertEqual(self.posted_messages(start), [])
                 self.assertEqual(len(self.titles(folder)), 1)

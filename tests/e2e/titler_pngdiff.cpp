@@ -4,6 +4,9 @@
 //   size FILE                        width and height
 //   alpha FILE                       bounding box and number of the pixels that are not wholly transparent
 //   changed OLD NEW                  bounding box and number of the pixels that differ
+//   pictures A B DIFF                how far two pictures of the same size are from each other, on mid grey,
+//   where
+//                                    either is not transparent; answer and DIFF as with screen
 //   screen SHOT X Y W H TITLE DIFF   how far the screenshot's rectangle is from the title picture scaled to W
 //   x H.
 //                                    Differences are per pixel the largest of the three channels, 0 to 255.
@@ -118,32 +121,22 @@ std::optional<QJsonObject> changedBetween(const QStringList& arguments)
     });
 }
 
-std::optional<QJsonObject> compareWithScreen(const QStringList& arguments)
+// Both pictures have one size; pixels for which skip is true do not count.
+QJsonObject compare(const QImage& shown, const QImage& wanted, const QString& sheetPath,
+                    const std::function<bool(int, int)>& skip)
 {
-    const auto screen = load(arguments.at(0));
-    const QRect rect(arguments.at(1).toInt(), arguments.at(2).toInt(), arguments.at(3).toInt(),
-                     arguments.at(4).toInt());
-    const auto title = load(arguments.at(5));
-    if (!screen || !title || !screen->rect().contains(rect)) {
-        return std::nullopt;
-    }
-    const QImage shown = screen->copy(rect);
-    // Where the title is transparent, the screen shows what lies under the canvas; it is not compared.
-    const QImage wanted = title->scaled(rect.size(), Qt::IgnoreAspectRatio, Qt::SmoothTransformation)
-                              .convertToFormat(QImage::Format_ARGB32);
-
-    QImage difference(rect.size(), QImage::Format_RGB32);
+    const QSize size = wanted.size();
+    QImage difference(size, QImage::Format_RGB32);
     difference.fill(Qt::black);
     std::array<qint64, 256> histogram{};
     qint64 compared = 0;
     qint64 sum = 0;
-    for (int y = 0; y < rect.height(); ++y) {
-        for (int x = 0; x < rect.width(); ++x) {
-            const QRgb pixel = wanted.pixel(x, y);
-            if (qAlpha(pixel) < 255) {
+    for (int y = 0; y < size.height(); ++y) {
+        for (int x = 0; x < size.width(); ++x) {
+            if (skip(x, y)) {
                 continue;
             }
-            const int level = std::max(distanceToNeighbourhood(pixel, shown, x, y),
+            const int level = std::max(distanceToNeighbourhood(wanted.pixel(x, y), shown, x, y),
                                        distanceToNeighbourhood(shown.pixel(x, y), wanted, x, y));
             ++histogram.at(static_cast<std::size_t>(level));
             ++compared;
@@ -159,20 +152,58 @@ std::optional<QJsonObject> compareWithScreen(const QStringList& arguments)
         largest = count > 0 ? level : largest;
     }
 
-    QImage sheet(rect.width() * 3, rect.height(), QImage::Format_RGB32);
+    QImage sheet(size.width() * 3, size.height(), QImage::Format_RGB32);
     sheet.fill(Qt::darkGray);
     QPainter painter(&sheet);
     painter.drawImage(0, 0, shown);
-    painter.drawImage(rect.width(), 0, wanted);
-    painter.drawImage(rect.width() * 2, 0, difference);
+    painter.drawImage(size.width(), 0, wanted);
+    painter.drawImage(size.width() * 2, 0, difference);
     painter.end();
-    sheet.save(arguments.at(6));
+    sheet.save(sheetPath);
 
     const double pixels = static_cast<double>(std::max<qint64>(compared, 1));
     return QJsonObject{{"compared", compared},
                        {"mean", static_cast<double>(sum) / pixels},
                        {"largest", largest},
                        {"visible", static_cast<double>(visible) / pixels}};
+}
+
+std::optional<QJsonObject> compareWithScreen(const QStringList& arguments)
+{
+    const auto screen = load(arguments.at(0));
+    const QRect rect(arguments.at(1).toInt(), arguments.at(2).toInt(), arguments.at(3).toInt(),
+                     arguments.at(4).toInt());
+    const auto title = load(arguments.at(5));
+    if (!screen || !title || !screen->rect().contains(rect)) {
+        return std::nullopt;
+    }
+    const QImage shown = screen->copy(rect);
+    // Where the title is transparent, the screen shows what lies under the canvas; it is not compared.
+    const QImage wanted = title->scaled(rect.size(), Qt::IgnoreAspectRatio, Qt::SmoothTransformation)
+                              .convertToFormat(QImage::Format_ARGB32);
+    return compare(shown, wanted, arguments.at(6),
+                   [&wanted](int x, int y) { return qAlpha(wanted.pixel(x, y)) < 255; });
+}
+
+QImage onGrey(const QImage& picture)
+{
+    QImage result(picture.size(), QImage::Format_ARGB32);
+    result.fill(Qt::gray);
+    QPainter painter(&result);
+    painter.drawImage(0, 0, picture);
+    return result;
+}
+
+std::optional<QJsonObject> comparePictures(const QStringList& arguments)
+{
+    const auto one = load(arguments.at(0));
+    const auto other = load(arguments.at(1));
+    if (!one || !other || one->size() != other->size()) {
+        return std::nullopt;
+    }
+    return compare(onGrey(*one), onGrey(*other), arguments.at(2), [&](int x, int y) {
+        return qAlpha(one->pixel(x, y)) == 0 && qAlpha(other->pixel(x, y)) == 0;
+    });
 }
 
 } // namespace
@@ -189,6 +220,8 @@ int main(int argc, char* argv[])
         answer = alphaOf(arguments);
     } else if (command == QLatin1String("changed") && arguments.size() == 2) {
         answer = changedBetween(arguments);
+    } else if (command == QLatin1String("pictures") && arguments.size() == 3) {
+        answer = comparePictures(arguments);
     } else if (command == QLatin1String("screen") && arguments.size() == 7) {
         answer = compareWithScreen(arguments);
     }

@@ -53,7 +53,7 @@ private:
         mFolders.take();
         return folder;
     }
-    ArchiveItem* item(int index) { return mList->getWidgetItem(index); }
+    ArchiveItem* item(int index) { return mList->archiveItem(index); }
     int selected() const { return mList->getItemIndex(mList->getSelectedArchive()); }
     QString stem(int index) { return QFileInfo(item(index)->getArchiveDataPath()).completeBaseName(); }
     void choose(int index, ArchiveAction::ARCHIVE_ACTION_TYPE type)

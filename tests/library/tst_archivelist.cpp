@@ -52,12 +52,12 @@ private slots:
     void language();
 
 private:
-    ArchiveItem* item(int index) { return mList->getWidgetItem(index); }
+    ArchiveItem* item(int index) { return mList->archiveItem(index); }
     QStringList stems() const
     {
         QStringList result;
         for (int i = 0; i < mList->count(); ++i)
-            result.append(QFileInfo(mList->getWidgetItem(i)->getArchiveDataPath()).completeBaseName());
+            result.append(QFileInfo(mList->archiveItem(i)->getArchiveDataPath()).completeBaseName());
         return result;
     }
     void tap(int index)
@@ -65,7 +65,14 @@ private:
         ArchiveItem* target = item(index);
         QTest::mouseClick(target, Qt::LeftButton, Qt::NoModifier, QPoint(20, 20));
     }
-    QMenu* menu() { return mList->findChild<ArchiveMenu*>(); }
+    ArchiveMenu* menu() { return mList->findChild<ArchiveMenu*>(); }
+    // Opens the menu on the item and chooses an entry.
+    void choose(int index, ArchiveAction::ARCHIVE_ACTION_TYPE type)
+    {
+        QTest::mouseClick(item(index), Qt::RightButton, Qt::NoModifier, QPoint(20, 20));
+        const auto row = static_cast<int>(menu()->actions().indexOf(menu()->action(type)));
+        QTest::mouseClick(menu(), Qt::LeftButton, Qt::NoModifier, menu()->getMenuItemRect(row).center());
+    }
     QStringList enabledActions()
     {
         QStringList result;
@@ -218,13 +225,10 @@ void tst_ArchiveList::fullFolderRefusesNewTitles()
     QCOMPARE(mMessages.take(), (Reports{{112, QStringLiteral("99")}}));
 
     QTRY_VERIFY(item(0)->hasChildWidgets());
-    QTest::mouseClick(item(0), Qt::RightButton, Qt::NoModifier, QPoint(20, 20));
-    ArchiveMenu* options = mList->findChild<ArchiveMenu*>();
-    options->action(ArchiveAction::ACTION_CREATE)->trigger();
+    choose(0, ArchiveAction::ACTION_CREATE);
     QCOMPARE(mMessages.take(), (Reports{{112, QStringLiteral("99")}}));
-    options->action(ArchiveAction::ACTION_COPY)->trigger();
-    QTest::mouseClick(item(0), Qt::RightButton, Qt::NoModifier, QPoint(20, 20));
-    options->action(ArchiveAction::ACTION_PASTE)->trigger();
+    choose(0, ArchiveAction::ACTION_COPY);
+    choose(0, ArchiveAction::ACTION_PASTE);
     QCOMPARE(mMessages.take(), (Reports{{113, QStringLiteral("99")}}));
     QCOMPARE(picker.count(), 0);
 }
@@ -233,20 +237,19 @@ void tst_ArchiveList::fullDiskRefusesNewTitles()
 {
     QSignalSpy picker(mList.get(), &ArchiveList::startTemplatePicker);
     mList->refreshArchiveList(threeTitles(QStringLiteral("disk")));
-    QTest::mouseClick(item(0), Qt::RightButton, Qt::NoModifier, QPoint(20, 20));
-    ArchiveMenu* options = mList->findChild<ArchiveMenu*>();
-    options->action(ArchiveAction::ACTION_COPY)->trigger();
-    QTest::mouseClick(item(0), Qt::RightButton, Qt::NoModifier, QPoint(20, 20));
+    choose(0, ArchiveAction::ACTION_COPY);
     qputenv("K2SYS_FS_REMAIN", "199999999");
     QVERIFY(mList->checkDiskSpaceIsFull());
-    options->action(ArchiveAction::ACTION_CREATE)->trigger();
+    choose(0, ArchiveAction::ACTION_CREATE);
     QCOMPARE(mMessages.take(), (Reports{{114, QStringLiteral("File")}}));
-    options->action(ArchiveAction::ACTION_PASTE)->trigger();
+    choose(0, ArchiveAction::ACTION_PASTE);
     QCOMPARE(mMessages.take(), (Reports{{116, QString()}}));
+    choose(0, ArchiveAction::ACTION_ADD_USER);
+    QCOMPARE(mMessages.take(), (Reports{{197, QStringLiteral("UserTemplate_001")}}));
     QCOMPARE(picker.count(), 0);
     qputenv("K2SYS_FS_REMAIN", "200000000");
     QVERIFY(!mList->checkDiskSpaceIsFull());
-    options->action(ArchiveAction::ACTION_CREATE)->trigger();
+    choose(0, ArchiveAction::ACTION_CREATE);
     QCOMPARE(picker.count(), 1);
 }
 
@@ -259,7 +262,7 @@ void tst_ArchiveList::autoInitTakesTheLastFolder()
     QTRY_COMPARE(list.count(), 3);
     QCOMPARE(list.getCurrentPath(), folder);
     QCOMPARE(label.text(), QStringLiteral("last"));
-    QCOMPARE(list.getSelectedArchive(), list.getWidgetItem(0));
+    QCOMPARE(list.getSelectedArchive(), list.archiveItem(0));
     QCOMPARE(mFolders.take(), (QStringList{QStringLiteral("start last")}));
 }
 
@@ -360,9 +363,7 @@ void tst_ArchiveList::menuOnEmptyArea()
     QTest::mouseClick(mList->viewport(), Qt::RightButton, Qt::NoModifier, QPoint(200, 900));
     QCOMPARE(enabledActions(), (QStringList{QStringLiteral("Create New")}));
     mList->slotHideOptionMenu();
-    QTest::mouseClick(item(0), Qt::RightButton, Qt::NoModifier, QPoint(20, 20));
-    mList->findChild<ArchiveMenu*>()->action(ArchiveAction::ACTION_COPY)->trigger();
-    mList->slotHideOptionMenu();
+    choose(0, ArchiveAction::ACTION_COPY);
     QTest::mouseClick(mList->viewport(), Qt::RightButton, Qt::NoModifier, QPoint(200, 900));
     QCOMPARE(enabledActions(), (QStringList{QStringLiteral("Create New"), QStringLiteral("Paste")}));
     mList->slotHideOptionMenu();
@@ -375,8 +376,8 @@ void tst_ArchiveList::menuOnAnItem()
 {
     mList->refreshArchiveList(threeTitles(QStringLiteral("on item")));
     QTest::mouseClick(item(1), Qt::RightButton, Qt::NoModifier, QPoint(20, 20));
-    QCOMPARE(enabledActions(),
-             (QStringList{QStringLiteral("Create New"), QStringLiteral("Copy"), QStringLiteral("Delete")}));
+    QCOMPARE(enabledActions(), (QStringList{QStringLiteral("Create New"), QStringLiteral("Copy"),
+                                            QStringLiteral("Delete"), QStringLiteral("Save as Template")}));
     QList<int> types;
     for (QAction* action : menu()->actions())
         types.append(qobject_cast<ArchiveAction*>(action)->getActionType());
@@ -570,17 +571,17 @@ void tst_ArchiveList::selectionIsScrolledIntoView()
 void tst_ArchiveList::moveModeIgnoresTaps()
 {
     mList->refreshArchiveList(threeTitles(QStringLiteral("move mode")));
-    QCOMPARE(mList->getMoveState(), 0);
+    QVERIFY(!mList->isMoveMode());
     QSignalSpy drag(mList.get(), &ArchiveList::signalItemsCanDrag);
     mList->moveButtonClicked(true);
-    QCOMPARE(mList->getMoveState(), 1);
+    QVERIFY(mList->isMoveMode());
     mCanvas.clear();
     tap(1);
     QTest::mouseClick(item(1), Qt::RightButton, Qt::NoModifier, QPoint(20, 20));
     QVERIFY(mCanvas.isEmpty());
     QVERIFY(!mList->IsOptionMenuShowing());
     mList->moveButtonClicked(false);
-    QCOMPARE(mList->getMoveState(), 0);
+    QVERIFY(!mList->isMoveMode());
     QCOMPARE(drag.count(), 2);
 }
 
@@ -604,8 +605,9 @@ void tst_ArchiveList::language()
     QTRY_VERIFY(item(2)->hasChildWidgets());
     mList->translateText();
     mList->setSystemLanFont(QStringLiteral("DFHeiW5-A"));
-    QCOMPARE(item(0)->findChild<QLabel*>()->font().family(), QStringLiteral("DFHeiW5-A"));
-    QCOMPARE(item(0)->findChild<QLabel*>()->font().pixelSize(), 28);
+    const QFont font = item(0)->getRightChild()->findChild<QLabel*>()->font();
+    QCOMPARE(font.family(), QStringLiteral("DFHeiW5-A"));
+    QCOMPARE(font.pixelSize(), 28);
     QTest::mouseClick(item(1), Qt::RightButton, Qt::NoModifier, QPoint(20, 20));
     QCOMPARE(menu()->font().family(), QStringLiteral("DFHeiW5-A"));
     mList->setSystemLanFont(QStringLiteral("KST"));

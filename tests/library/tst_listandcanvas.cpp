@@ -90,7 +90,7 @@ void tst_ListAndCanvas::selectedTitleIsOnTheCanvas()
     LibraryFixture::fillFolder(folder, {QStringLiteral("a"), QStringLiteral("b")});
     mList->refreshArchiveListInFile(folder, QStringLiteral("b.xml"));
     QCOMPARE(canvasTitle(), QStringLiteral("b"));
-    QTest::mouseClick(mList->getWidgetItem(0), Qt::LeftButton, Qt::NoModifier, QPoint(20, 20));
+    QTest::mouseClick(mList->archiveItem(0), Qt::LeftButton, Qt::NoModifier, QPoint(20, 20));
     QCOMPARE(canvasTitle(), QStringLiteral("a"));
     mStack->undo();
     QCOMPARE(canvasTitle(), QStringLiteral("b"));
@@ -102,7 +102,7 @@ void tst_ListAndCanvas::newTitleShowsItsPictureAtOnce()
     mList->refreshArchiveList(mFixture.makeFolder(QStringLiteral("new")));
     createTitle(QStringLiteral("速報 New"));
     QCOMPARE(mList->count(), 1);
-    const ArchiveItem* item = mList->getWidgetItem(0);
+    const ArchiveItem* item = mList->archiveItem(0);
     QCOMPARE(item->textLines().front(), QStringLiteral("速報 New"));
     QCOMPARE(canvasTitle(), QString::fromStdString(item->getArchiveData()->getName()));
     QVERIFY(!QFile::exists(item->getArchiveData()->getFullPathOfThumbnailSmall()));

@@ -32,6 +32,7 @@ private Q_SLOTS:
     void buttonsDoNotDrag();
     void masksTakeTheTouches();
     void buttonsStandBetweenTheLines();
+    void cornersAreDark();
 
 private:
     ColorButton* button(int index) const { return m_palette->findChildren<ColorButton*>().at(index); }
@@ -73,6 +74,15 @@ void TestColorPalette::table()
     QCOMPARE(colors.at(29), QStringLiteral("#FFC4FD"));
     for (int i = 0; i < 30; ++i)
         QCOMPARE(button(i)->grab().toImage().pixelColor(20, 20), QColor(colors.at(i)));
+}
+
+// The picture of the frame is round; beside it nothing of the system's colours shows.
+void TestColorPalette::cornersAreDark()
+{
+    const QImage picture = m_palette->grab().toImage();
+    const QRect area = picture.rect();
+    for (const QPoint& corner : {area.topLeft(), area.topRight(), area.bottomLeft(), area.bottomRight()})
+        QVERIFY2(qGray(picture.pixel(corner)) < 64, qPrintable(picture.pixelColor(corner).name()));
 }
 
 void TestColorPalette::opensOnItsColor()

@@ -5,7 +5,6 @@
 #include "panel/SizeBoxLineEdit.h"
 #include "panel/SizeToolBox.h"
 #include "touchui/CustomComboBoxView.h"
-#include "touchui/KSCombobox.h"
 #include "touchui/KSInputContext.h"
 #include "touchui/KSPushbutton.h"
 
@@ -33,6 +32,7 @@ private Q_SLOTS:
     void stepsStopAtTheEnds();
     void listSetsAllCharacters();
     void listIsScrolledByAFinger();
+    void listRowsAreWideEnough();
     void listOpensOnlyWhileEnabled();
     void tapsEditAndSelect();
     void typedSizes_data();
@@ -208,6 +208,16 @@ void TestSizeBox::listIsScrolledByAFinger()
     QTest::touchEvent(viewport, m_environment->device.get()).release(0, low - QPoint(0, 150), viewport);
     QVERIFY(changed.isEmpty()); // a drag chooses nothing
     QVERIFY(combo()->isPopupVisible());
+    combo()->hidePopup();
+}
+
+// The box is narrow; its list is not.
+void TestSizeBox::listRowsAreWideEnough()
+{
+    combo()->showPopup();
+    QTRY_VERIFY(combo()->isPopupVisible());
+    const int room = combo()->listView()->viewport()->width();
+    QVERIFY2(room >= combo()->listView()->sizeHintForColumn(0), qPrintable(QString::number(room)));
     combo()->hidePopup();
 }
 

@@ -44,6 +44,7 @@ private Q_SLOTS:
     void edgeSliderDragIsOneStep();
     void edgeSliderReturnedIsNoStep();
     void edgeSliderClosesByATouchBeside();
+    void edgeSliderIsFramedAllRound();
     void edgeColorStates();
     void textColorStates();
     void colorButtonText();
@@ -328,6 +329,19 @@ void TestToolBoxes::edgeSliderReturnedIsNoStep()
     QCOMPARE(spy.size(), 2);
     for (const QVariantList& preview : std::as_const(spy))
         QCOMPARE(preview.mid(2), (QVariantList{6, 0, 2}));
+}
+
+void TestToolBoxes::edgeSliderIsFramedAllRound()
+{
+    EdgeSizeSlider slider(nullptr);
+    slider.resize(slider.sizeHint());
+    QImage picture(slider.size(), QImage::Format_ARGB32_Premultiplied);
+    picture.fill(Qt::transparent);
+    slider.render(&picture, QPoint(), QRegion(), QWidget::RenderFlags());
+    const QPoint middle = picture.rect().center();
+    for (const QPoint& edge : {QPoint(middle.x(), 1), QPoint(middle.x(), picture.height() - 2),
+                               QPoint(1, middle.y()), QPoint(picture.width() - 2, middle.y())})
+        QVERIFY2(qAlpha(picture.pixel(edge)) > 0, qPrintable(QString::number(edge.y())));
 }
 
 void TestToolBoxes::edgeSliderClosesByATouchBeside()

@@ -1,17 +1,11 @@
 // The touch tree under real fingers and the mouse, through the application's filter.
 #include "TreeViewFixture.h"
 
-#include <QVBoxLayout>
-
-class TestTreeView : public QObject, protected TreeViewFixture
+class TestTreeView : public TreeViewFixture
 {
     Q_OBJECT
 
 private Q_SLOTS:
-    void initTestCase() { Q_INIT_RESOURCE(UILibrary); }
-    void init() { open(); }
-    void cleanup() { close(); }
-
     void opensWithoutMakingHiddenChildren();
     void tapSelectsOnRelease();
     void tapOnTheIndicatorOpensAndCloses();
@@ -35,17 +29,11 @@ private Q_SLOTS:
     void shortListDoesNotScroll();
     void dragCreepsByTwo();
     void flickStepIsAtLeastAPixel();
+
     void tapOnTheHeaderSorts();
     void cancelOnTheHeaderSortsNothing();
     void sortKeepsTheCurrentRow();
     void keysDoNotMoveTheSelection();
-    void editorOpensAndCommits();
-    void editorCanBeReverted();
-    void editorIgnoresRowsThatAreNotEditable();
-    void selfEndingControlSurvivesTheLossOfFocus();
-    void editorKeepsItsTextWhenTheRowChanges();
-    void closingAStrangeEditorDoesNothing();
-    void rowVanishesUnderTheEditor();
 };
 
 void TestTreeView::opensWithoutMakingHiddenChildren()
@@ -73,9 +61,9 @@ void TestTreeView::tapSelectsOnRelease()
     QSignalSpy pressed(m_tree.get(), &QAbstractItemView::pressed);
     QSignalSpy clicked(m_tree.get(), &QAbstractItemView::clicked);
     QSignalSpy current(m_tree.get(), &KSTreeView::signalCurrentChangedByTouch);
-    QTest::touchEvent(m_area, m_device.get()).press(0, rowPoint(2), m_area);
+    QTest::touchEvent(m_area, m_device).press(0, rowPoint(2), m_area);
     QVERIFY(!m_tree->currentIndex().isValid());
-    QTest::touchEvent(m_area, m_device.get()).release(0, rowPoint(2) + QPoint(3, 3), m_area);
+    QTest::touchEvent(m_area, m_device).release(0, rowPoint(2) + QPoint(3, 3), m_area);
     QCOMPARE(m_tree->currentIndex(), m_model->index(2, 0));
     QVERIFY(m_tree->selectionModel()->isRowSelected(2, QModelIndex()));
     QCOMPARE(pressed.count(), 1);
@@ -90,9 +78,9 @@ void TestTreeView::tapOnTheIndicatorOpensAndCloses()
 {
     const QModelIndex folder = m_model->index(1, 0);
     const QPoint indicator = m_tree->getIndicatorRect(folder).center();
-    QTest::touchEvent(m_area, m_device.get()).press(0, indicator, m_area);
+    QTest::touchEvent(m_area, m_device).press(0, indicator, m_area);
     QVERIFY(m_tree->isIndicatorPressed(folder));
-    QTest::touchEvent(m_area, m_device.get()).release(0, indicator, m_area);
+    QTest::touchEvent(m_area, m_device).release(0, indicator, m_area);
     QVERIFY(m_tree->isExpanded(folder));
     QVERIFY(!m_tree->isIndicatorPressed(folder));
     QVERIFY(!m_tree->currentIndex().isValid());
@@ -125,11 +113,11 @@ void TestTreeView::slidingOffTheIndicatorDoesNothing()
 {
     const QModelIndex folder = m_model->index(1, 0);
     const QPoint indicator = m_tree->getIndicatorRect(folder).center();
-    QTest::touchEvent(m_area, m_device.get()).press(0, indicator, m_area);
-    QTest::touchEvent(m_area, m_device.get()).move(0, indicator + QPoint(60, 0), m_area);
+    QTest::touchEvent(m_area, m_device).press(0, indicator, m_area);
+    QTest::touchEvent(m_area, m_device).move(0, indicator + QPoint(60, 0), m_area);
     QVERIFY(!m_tree->isIndicatorPressed(folder));
-    QTest::touchEvent(m_area, m_device.get()).move(0, indicator, m_area);
-    QTest::touchEvent(m_area, m_device.get()).release(0, indicator, m_area);
+    QTest::touchEvent(m_area, m_device).move(0, indicator, m_area);
+    QTest::touchEvent(m_area, m_device).release(0, indicator, m_area);
     QVERIFY(!m_tree->isExpanded(folder));
     QVERIFY(!m_tree->currentIndex().isValid());
 }
@@ -140,12 +128,12 @@ void TestTreeView::holdMakesCurrentAndTells()
     QSignalSpy held(m_tree.get(), &KSTreeView::signalPressedAndHold);
     QSignalSpy pressed(m_tree.get(), &QAbstractItemView::pressed);
     QSignalSpy clicked(m_tree.get(), &QAbstractItemView::clicked);
-    QTest::touchEvent(m_area, m_device.get()).press(0, rowPoint(3), m_area);
+    QTest::touchEvent(m_area, m_device).press(0, rowPoint(3), m_area);
     m_tree->allTimersReset();
     QTRY_COMPARE(held.count(), 1);
     QCOMPARE(held.at(0).at(0).toModelIndex(), m_model->index(3, 0));
     QCOMPARE(m_tree->currentIndex().row(), 3);
-    QTest::touchEvent(m_area, m_device.get()).release(0, rowPoint(3), m_area);
+    QTest::touchEvent(m_area, m_device).release(0, rowPoint(3), m_area);
     QCOMPARE(pressed.count(), 1);
     QCOMPARE(clicked.count(), 0);
     QCOMPARE(held.count(), 1);
@@ -156,27 +144,27 @@ void TestTreeView::movementCancelsTheHold()
     m_tree->setHoldInterval(50);
     QSignalSpy held(m_tree.get(), &KSTreeView::signalPressedAndHold);
     // Sideways, so that no motion starts.
-    QTest::touchEvent(m_area, m_device.get()).press(0, rowPoint(3), m_area);
-    QTest::touchEvent(m_area, m_device.get())
+    QTest::touchEvent(m_area, m_device).press(0, rowPoint(3), m_area);
+    QTest::touchEvent(m_area, m_device)
         .move(0, rowPoint(3) + QPoint(QApplication::startDragDistance() + 1, 0), m_area);
     QTest::qWait(120);
     QCOMPARE(held.count(), 0);
-    QTest::touchEvent(m_area, m_device.get()).release(0, rowPoint(3), m_area);
+    QTest::touchEvent(m_area, m_device).release(0, rowPoint(3), m_area);
     QVERIFY(!m_tree->currentIndex().isValid());
 }
 
 void TestTreeView::dragScrollsAndSelectsNothing()
 {
-    QTest::touchEvent(m_area, m_device.get()).press(0, rowPoint(8), m_area);
-    QTest::touchEvent(m_area, m_device.get()).move(0, rowPoint(8) + QPoint(0, -10), m_area);
-    QTest::touchEvent(m_area, m_device.get()).move(0, rowPoint(8) + QPoint(0, -210), m_area);
+    QTest::touchEvent(m_area, m_device).press(0, rowPoint(8), m_area);
+    QTest::touchEvent(m_area, m_device).move(0, rowPoint(8) + QPoint(0, -10), m_area);
+    QTest::touchEvent(m_area, m_device).move(0, rowPoint(8) + QPoint(0, -210), m_area);
     QVERIFY(m_tree->hasFlicked());
     QVERIFY(!m_tree->isAutoFilck());
     // The list follows until it is within reach of the finger: the first movement does not count.
     QTRY_VERIFY(m_tree->isFlickEnd());
     QTRY_VERIFY(qAbs(m_tree->verticalScrollBar()->value() - 200) <= 10);
     const int value = m_tree->verticalScrollBar()->value();
-    QTest::touchEvent(m_area, m_device.get()).release(0, rowPoint(8) + QPoint(0, -210), m_area);
+    QTest::touchEvent(m_area, m_device).release(0, rowPoint(8) + QPoint(0, -210), m_area);
     QVERIFY(!m_tree->isAutoFilck());
     QCOMPARE(m_tree->verticalScrollBar()->value(), value);
     QVERIFY(!m_tree->currentIndex().isValid());
@@ -221,10 +209,10 @@ void TestTreeView::brakeSelectsNothing()
     swipe(rowPoint(8), -60, 3);
     QVERIFY(m_tree->isAutoFilck());
     QTRY_VERIFY(m_tree->verticalScrollBar()->value() > 0);
-    QTest::touchEvent(m_area, m_device.get()).press(0, rowPoint(5), m_area);
+    QTest::touchEvent(m_area, m_device).press(0, rowPoint(5), m_area);
     QVERIFY(!m_tree->isAutoFilck());
     const int value = m_tree->verticalScrollBar()->value();
-    QTest::touchEvent(m_area, m_device.get()).release(0, rowPoint(5), m_area);
+    QTest::touchEvent(m_area, m_device).release(0, rowPoint(5), m_area);
     QTest::qWait(80); // two ticks, if there were any
     QCOMPARE(m_tree->verticalScrollBar()->value(), value);
     QVERIFY(!m_tree->currentIndex().isValid());
@@ -252,7 +240,7 @@ void TestTreeView::fiveRowsOfPixelsAreNoFlick()
 
 void TestTreeView::secondFingerIsIgnored()
 {
-    auto touch = QTest::touchEvent(m_area, m_device.get(), false);
+    auto touch = QTest::touchEvent(m_area, m_device, false);
     touch.press(0, rowPoint(2), m_area).commit();
     touch.stationary(0).press(1, rowPoint(6), m_area).commit();
     touch.stationary(0).move(1, rowPoint(1), m_area).commit();
@@ -265,7 +253,7 @@ void TestTreeView::secondFingerIsIgnored()
 
 void TestTreeView::trackedFingerLiftsFirst()
 {
-    auto touch = QTest::touchEvent(m_area, m_device.get(), false);
+    auto touch = QTest::touchEvent(m_area, m_device, false);
     touch.press(0, rowPoint(2), m_area).commit();
     touch.stationary(0).press(1, rowPoint(6), m_area).commit();
     touch.release(0, rowPoint(2), m_area).stationary(1).commit();
@@ -282,7 +270,7 @@ void TestTreeView::otherWidgetIsLockedOut()
 {
     QWidget* head = m_tree->header()->viewport();
     QSignalSpy sorted(m_tree->header(), &QHeaderView::sectionClicked);
-    auto touch = QTest::touchEvent(m_tree.get(), m_device.get(), false);
+    auto touch = QTest::touchEvent(m_tree.get(), m_device, false);
     touch.press(0, rowPoint(2), m_area).commit();
     touch.stationary(0).press(1, QPoint(100, 20), head).commit();
     touch.stationary(0).release(1, QPoint(100, 20), head).commit();
@@ -295,12 +283,12 @@ void TestTreeView::cancelledTouchSelectsNothing()
 {
     m_tree->setHoldInterval(40);
     QSignalSpy held(m_tree.get(), &KSTreeView::signalPressedAndHold);
-    QTest::touchEvent(m_area, m_device.get()).press(0, rowPoint(2), m_area);
-    QTouchEvent cancel(QEvent::TouchCancel, m_device.get());
+    QTest::touchEvent(m_area, m_device).press(0, rowPoint(2), m_area);
+    QTouchEvent cancel(QEvent::TouchCancel, m_device);
     QApplication::sendEvent(m_area, &cancel);
     QTest::qWait(100);
     QCOMPARE(held.count(), 0);
-    QTest::touchEvent(m_area, m_device.get()).release(0, rowPoint(2), m_area);
+    QTest::touchEvent(m_area, m_device).release(0, rowPoint(2), m_area);
     QVERIFY(!m_tree->currentIndex().isValid());
     touchTap(rowPoint(2));
     QCOMPARE(m_tree->currentIndex().row(), 2);
@@ -316,11 +304,11 @@ void TestTreeView::hidingEndsEverything()
     QVERIFY(!m_tree->isAutoFilck());
     m_tree->show();
     QVERIFY(QTest::qWaitForWindowExposed(m_tree.get()));
-    QTest::touchEvent(m_area, m_device.get()).press(0, rowPoint(2), m_area);
+    QTest::touchEvent(m_area, m_device).press(0, rowPoint(2), m_area);
     m_tree->hide();
     QTest::qWait(100);
     QCOMPARE(held.count(), 0);
-    QTest::touchEvent(m_area, m_device.get()).release(0, rowPoint(2), m_area);
+    QTest::touchEvent(m_area, m_device).release(0, rowPoint(2), m_area);
 }
 
 void TestTreeView::mouseTapsAndScrolls()
@@ -383,8 +371,8 @@ void TestTreeView::tapOnTheHeaderSorts()
     QCOMPARE(m_model->index(0, 0).data().toString(), QStringLiteral("Folder 000"));
     QWidget* head = m_tree->header()->viewport();
     for (const char* first : {"Folder 000", "Folder 039", "Folder 000"}) {
-        QTest::touchEvent(head, m_device.get()).press(0, QPoint(100, 20), head);
-        QTest::touchEvent(head, m_device.get()).release(0, QPoint(100, 20), head);
+        QTest::touchEvent(head, m_device).press(0, QPoint(100, 20), head);
+        QTest::touchEvent(head, m_device).release(0, QPoint(100, 20), head);
         QCOMPARE(m_model->index(0, 0).data().toString(), QLatin1String(first));
     }
     QTest::mouseClick(head, Qt::LeftButton, {}, QPoint(100, 20));
@@ -396,14 +384,14 @@ void TestTreeView::cancelOnTheHeaderSortsNothing()
     m_tree->setSortingEnabled(true);
     QWidget* head = m_tree->header()->viewport();
     QSignalSpy clicked(m_tree->header(), &QHeaderView::sectionClicked);
-    QTest::touchEvent(head, m_device.get()).press(0, QPoint(100, 20), head);
-    QTouchEvent cancel(QEvent::TouchCancel, m_device.get());
+    QTest::touchEvent(head, m_device).press(0, QPoint(100, 20), head);
+    QTouchEvent cancel(QEvent::TouchCancel, m_device);
     QApplication::sendEvent(head, &cancel);
     QCOMPARE(clicked.count(), 0);
-    QTest::touchEvent(head, m_device.get()).release(0, QPoint(100, 20), head);
-    QTest::touchEvent(head, m_device.get()).press(0, QPoint(100, 20), head);
-    QTest::touchEvent(head, m_device.get()).move(0, QPoint(600, 20), head); // off the section
-    QTest::touchEvent(head, m_device.get()).release(0, QPoint(600, 20), head);
+    QTest::touchEvent(head, m_device).release(0, QPoint(100, 20), head);
+    QTest::touchEvent(head, m_device).press(0, QPoint(100, 20), head);
+    QTest::touchEvent(head, m_device).move(0, QPoint(600, 20), head); // off the section
+    QTest::touchEvent(head, m_device).release(0, QPoint(600, 20), head);
     QCOMPARE(clicked.count(), 0);
     QCOMPARE(m_tree->header()->sortIndicatorSection(), -1);
 }
@@ -428,93 +416,6 @@ void TestTreeView::keysDoNotMoveTheSelection()
         QCOMPARE(m_tree->currentIndex().row(), 5);
     }
     QVERIFY(!m_tree->isExpanded(m_model->index(5, 0)));
-}
-
-void TestTreeView::editorOpensAndCommits()
-{
-    QSignalSpy initialised(m_tree->treeDelegate(), &CustomTreeDelegete::signalLineEditInitialize);
-    QSignalSpy committed(m_tree->treeDelegate(), &CustomTreeDelegete::signalLineEditCommitted);
-    const QModelIndex folder = m_model->index(2, 0);
-    Q_EMIT m_tree->editorEvent(folder);
-    auto* editor = m_tree->findChild<QLineEdit*>();
-    QVERIFY(editor != nullptr);
-    QCOMPARE(initialised.count(), 1);
-    QCOMPARE(m_tree->getRenameIndex(), folder);
-    QCOMPARE(editor->text(), QStringLiteral("Folder 002"));
-    QVERIFY(m_tree->visualRect(folder).contains(editor->geometry()));
-    editor->setText(QStringLiteral("Renamed"));
-    m_tree->closeEditorState(editor, QAbstractItemDelegate::NoHint);
-    QCOMPARE(folder.data().toString(), QStringLiteral("Renamed"));
-    QCOMPARE(committed.count(), 1);
-    QCOMPARE(committed.at(0).at(0).toString(), QStringLiteral("Renamed"));
-    QVERIFY(!m_tree->getRenameIndex().isValid());
-    QTRY_VERIFY(m_tree->findChild<QLineEdit*>() == nullptr);
-}
-
-void TestTreeView::editorCanBeReverted()
-{
-    const QModelIndex folder = m_model->index(2, 0);
-    Q_EMIT m_tree->editorEvent(folder);
-    auto* editor = m_tree->findChild<QLineEdit*>();
-    editor->setText(QStringLiteral("Renamed"));
-    m_tree->closeEditorState(editor, QAbstractItemDelegate::RevertModelCache);
-    QCOMPARE(folder.data().toString(), QStringLiteral("Folder 002"));
-    QVERIFY(!m_tree->getRenameIndex().isValid());
-}
-
-void TestTreeView::editorIgnoresRowsThatAreNotEditable()
-{
-    QTest::ignoreMessage(QtWarningMsg, "edit: editing failed");
-    Q_EMIT m_tree->editorEvent(m_model->index(2, 1));
-    QVERIFY(m_tree->findChild<QLineEdit*>() == nullptr);
-    QVERIFY(!m_tree->getRenameIndex().isValid());
-}
-
-void TestTreeView::selfEndingControlSurvivesTheLossOfFocus()
-{
-    Q_EMIT m_tree->editorEvent(m_model->index(2, 0));
-    QPointer<QLineEdit> editor = m_tree->findChild<QLineEdit*>();
-    editor->setText(QStringLiteral("Half a na"));
-    m_tree->setFocus();
-    QTest::keyClick(editor, Qt::Key_Return);
-    QTest::keyClick(editor, Qt::Key_Escape);
-    QCoreApplication::sendPostedEvents(nullptr, QEvent::DeferredDelete);
-    QVERIFY(editor != nullptr);
-    QCOMPARE(m_model->index(2, 0).data().toString(), QStringLiteral("Folder 002"));
-    m_tree->closeEditorState(editor, QAbstractItemDelegate::NoHint);
-}
-
-void TestTreeView::editorKeepsItsTextWhenTheRowChanges()
-{
-    const QModelIndex folder = m_model->index(2, 0);
-    Q_EMIT m_tree->editorEvent(folder);
-    auto* editor = m_tree->findChild<QLineEdit*>();
-    editor->selectAll();
-    QTest::keyClicks(editor, QStringLiteral("typed"));
-    m_model->setData(folder, QStringLiteral("from elsewhere"));
-    QCOMPARE(editor->text(), QStringLiteral("typed"));
-    m_tree->closeEditorState(editor, QAbstractItemDelegate::NoHint);
-    QCOMPARE(folder.data().toString(), QStringLiteral("typed"));
-}
-
-void TestTreeView::closingAStrangeEditorDoesNothing()
-{
-    QLineEdit stranger;
-    m_tree->closeEditorState(&stranger, QAbstractItemDelegate::NoHint);
-    m_tree->closeEditorState(nullptr, QAbstractItemDelegate::NoHint);
-    QCOMPARE(m_model->index(0, 0).data().toString(), QStringLiteral("Folder 000"));
-}
-
-void TestTreeView::rowVanishesUnderTheEditor()
-{
-    Q_EMIT m_tree->editorEvent(m_model->index(2, 0));
-    QPointer<QLineEdit> editor = m_tree->findChild<QLineEdit*>();
-    m_model->removeRow(2);
-    QVERIFY(!m_tree->getRenameIndex().isValid());
-    if (editor != nullptr) {
-        m_tree->closeEditorState(editor, QAbstractItemDelegate::NoHint);
-    }
-    QCOMPARE(m_model->index(2, 0).data().toString(), QStringLiteral("Folder 003"));
 }
 
 QTEST_MAIN(TestTreeView)

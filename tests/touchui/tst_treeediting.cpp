@@ -1,21 +1,18 @@
-// What the touch tree shows: marks, check boxes, rows and the selection.
+// Editors, check boxes and marks in the rows of the touch tree, and what it paints.
 #include "TreeViewFixture.h"
 
-namespace
-{
-
-const QColor BACKGROUND(51, 51, 51);
-
-} // namespace
-
-class TestTreeViewLooks : public QObject, protected TreeViewFixture
+class TestTreeEditing : public TreeViewFixture
 {
     Q_OBJECT
 
 private Q_SLOTS:
-    void initTestCase() { Q_INIT_RESOURCE(UILibrary); }
-    void init() { open(); }
-    void cleanup() { close(); }
+    void editorOpensAndCommits();
+    void editorCanBeReverted();
+    void editorIgnoresRowsThatAreNotEditable();
+    void selfEndingControlSurvivesTheLossOfFocus();
+    void editorKeepsItsTextWhenTheRowChanges();
+    void closingAStrangeEditorDoesNothing();
+    void rowVanishesUnderTheEditor();
 
     void moveToSibling();
     void checkBoxesFollowEachOther();
@@ -24,6 +21,7 @@ private Q_SLOTS:
     void loadingMarksStep();
     void recordingMarks();
     void heldLongNameShowsABalloon();
+
     void designAttributes();
     void scrollBarsAreOurs();
     void paintsRowsToTheBottom();
@@ -32,7 +30,94 @@ private Q_SLOTS:
     void operationFocusSurroundsTheEditedRow();
 };
 
-void TestTreeViewLooks::moveToSibling()
+void TestTreeEditing::editorOpensAndCommits()
+{
+    QSignalSpy initialised(m_tree->treeDelegate(), &CustomTreeDelegete::signalLineEditInitialize);
+    QSignalSpy committed(m_tree->treeDelegate(), &CustomTreeDelegete::signalLineEditCommitted);
+    const QModelIndex folder = m_model->index(2, 0);
+    Q_EMIT m_tree->editorEvent(folder);
+    auto* editor = m_tree->findChild<QLineEdit*>();
+    QVERIFY(editor != nullptr);
+    QCOMPARE(initialised.count(), 1);
+    QCOMPARE(m_tree->getRenameIndex(), folder);
+    QCOMPARE(editor->text(), QStringLiteral("Folder 002"));
+    QVERIFY(m_tree->visualRect(folder).contains(editor->geometry()));
+    editor->setText(QStringLiteral("Renamed"));
+    m_tree->closeEditorState(editor, QAbstractItemDelegate::NoHint);
+    QCOMPARE(folder.data().toString(), QStringLiteral("Renamed"));
+    QCOMPARE(committed.count(), 1);
+    QCOMPARE(committed.at(0).at(0).toString(), QStringLiteral("Renamed"));
+    QVERIFY(!m_tree->getRenameIndex().isValid());
+    QTRY_VERIFY(m_tree->findChild<QLineEdit*>() == nullptr);
+}
+
+void TestTreeEditing::editorCanBeReverted()
+{
+    const QModelIndex folder = m_model->index(2, 0);
+    Q_EMIT m_tree->editorEvent(folder);
+    auto* editor = m_tree->findChild<QLineEdit*>();
+    editor->setText(QStringLiteral("Renamed"));
+    m_tree->closeEditorState(editor, QAbstractItemDelegate::RevertModelCache);
+    QCOMPARE(folder.data().toString(), QStringLiteral("Folder 002"));
+    QVERIFY(!m_tree->getRenameIndex().isValid());
+}
+
+void TestTreeEditing::editorIgnoresRowsThatAreNotEditable()
+{
+    QTest::ignoreMessage(QtWarningMsg, "edit: editing failed");
+    Q_EMIT m_tree->editorEvent(m_model->index(2, 1));
+    QVERIFY(m_tree->findChild<QLineEdit*>() == nullptr);
+    QVERIFY(!m_tree->getRenameIndex().isValid());
+}
+
+void TestTreeEditing::selfEndingControlSurvivesTheLossOfFocus()
+{
+    Q_EMIT m_tree->editorEvent(m_model->index(2, 0));
+    QPointer<QLineEdit> editor = m_tree->findChild<QLineEdit*>();
+    editor->setText(QStringLiteral("Half a na"));
+    m_tree->setFocus();
+    QTest::keyClick(editor, Qt::Key_Return);
+    QTest::keyClick(editor, Qt::Key_Escape);
+    QCoreApplication::sendPostedEvents(nullptr, QEvent::DeferredDelete);
+    QVERIFY(editor != nullptr);
+    QCOMPARE(m_model->index(2, 0).data().toString(), QStringLiteral("Folder 002"));
+    m_tree->closeEditorState(editor, QAbstractItemDelegate::NoHint);
+}
+
+void TestTreeEditing::editorKeepsItsTextWhenTheRowChanges()
+{
+    const QModelIndex folder = m_model->index(2, 0);
+    Q_EMIT m_tree->editorEvent(folder);
+    auto* editor = m_tree->findChild<QLineEdit*>();
+    editor->selectAll();
+    QTest::keyClicks(editor, QStringLiteral("typed"));
+    m_model->setData(folder, QStringLiteral("from elsewhere"));
+    QCOMPARE(editor->text(), QStringLiteral("typed"));
+    m_tree->closeEditorState(editor, QAbstractItemDelegate::NoHint);
+    QCOMPARE(folder.data().toString(), QStringLiteral("typed"));
+}
+
+void TestTreeEditing::closingAStrangeEditorDoesNothing()
+{
+    QLineEdit stranger;
+    m_tree->closeEditorState(&stranger, QAbstractItemDelegate::NoHint);
+    m_tree->closeEditorState(nullptr, QAbstractItemDelegate::NoHint);
+    QCOMPARE(m_model->index(0, 0).data().toString(), QStringLiteral("Folder 000"));
+}
+
+void TestTreeEditing::rowVanishesUnderTheEditor()
+{
+    Q_EMIT m_tree->editorEvent(m_model->index(2, 0));
+    QPointer<QLineEdit> editor = m_tree->findChild<QLineEdit*>();
+    m_model->removeRow(2);
+    QVERIFY(!m_tree->getRenameIndex().isValid());
+    if (editor != nullptr) {
+        m_tree->closeEditorState(editor, QAbstractItemDelegate::NoHint);
+    }
+    QCOMPARE(m_model->index(2, 0).data().toString(), QStringLiteral("Folder 003"));
+}
+
+void TestTreeEditing::moveToSibling()
 {
     QVERIFY(!m_tree->moveToSibling(m_model->index(2, 0)));
     QVERIFY(m_tree->insertRows(40, 1, QModelIndex()));
@@ -47,7 +132,7 @@ void TestTreeViewLooks::moveToSibling()
     QVERIFY(!m_tree->moveToSibling(QModelIndex()));
 }
 
-void TestTreeViewLooks::checkBoxesFollowEachOther()
+void TestTreeEditing::checkBoxesFollowEachOther()
 {
     m_source->checkable = true;
     m_model->createDataItems();
@@ -72,7 +157,7 @@ void TestTreeViewLooks::checkBoxesFollowEachOther()
     m_tree->changeCheckState(QModelIndex());
 }
 
-void TestTreeViewLooks::checkedFolderChecksChildrenMadeLater()
+void TestTreeEditing::checkedFolderChecksChildrenMadeLater()
 {
     m_source->checkable = true;
     m_model->createDataItems();
@@ -82,7 +167,7 @@ void TestTreeViewLooks::checkedFolderChecksChildrenMadeLater()
     QCOMPARE(m_model->index(2, 0, folder).data(Qt::CheckStateRole).toInt(), static_cast<int>(Qt::Checked));
 }
 
-void TestTreeViewLooks::checkBoxUnderTheFinger()
+void TestTreeEditing::checkBoxUnderTheFinger()
 {
     m_source->checkable = true;
     m_model->createDataItems();
@@ -90,22 +175,22 @@ void TestTreeViewLooks::checkBoxUnderTheFinger()
     const QPoint box = m_tree->getCheckBoxRect(folder).center();
     QVERIFY(m_tree->getCheckBoxRectForTouch(folder).contains(m_tree->getCheckBoxRect(folder)));
     QCOMPARE(m_tree->getCheckBoxImageType(folder), KSTreeView::OffRest);
-    QTest::touchEvent(m_area, m_device.get()).press(0, box, m_area);
+    QTest::touchEvent(m_area, m_device).press(0, box, m_area);
     QCOMPARE(m_tree->getCheckBoxImageType(folder), KSTreeView::OffPressed);
-    QTest::touchEvent(m_area, m_device.get()).release(0, box, m_area);
+    QTest::touchEvent(m_area, m_device).release(0, box, m_area);
     QCOMPARE(m_tree->getCheckBoxImageType(folder), KSTreeView::OnRest);
     QVERIFY(!m_tree->currentIndex().isValid());
-    QTest::touchEvent(m_area, m_device.get()).press(0, box, m_area);
-    QTest::touchEvent(m_area, m_device.get()).move(0, box + QPoint(60, 0), m_area);
+    QTest::touchEvent(m_area, m_device).press(0, box, m_area);
+    QTest::touchEvent(m_area, m_device).move(0, box + QPoint(60, 0), m_area);
     QCOMPARE(m_tree->getCheckBoxImageType(folder), KSTreeView::OnRest);
-    QTest::touchEvent(m_area, m_device.get()).release(0, box, m_area);
+    QTest::touchEvent(m_area, m_device).release(0, box, m_area);
     QCOMPARE(m_tree->getCheckBoxImageType(folder), KSTreeView::OnRest);
     m_tree->setCheckBoxVisible(false);
     QVERIFY(m_tree->getCheckBoxRect(folder).isNull());
     QVERIFY(m_tree->getCheckBoxRectForTouch(folder).isNull());
 }
 
-void TestTreeViewLooks::loadingMarksStep()
+void TestTreeEditing::loadingMarksStep()
 {
     QCOMPARE(m_tree->getLoadingImagePath(1), QStringLiteral(":/Views/Loading_Icon-01"));
     QCOMPARE(m_tree->getLoadingImagePath(8), QStringLiteral(":/Views/Loading_Icon-08"));
@@ -122,7 +207,7 @@ void TestTreeViewLooks::loadingMarksStep()
     QCOMPARE(folder.data(KSVIEW::ItemLoadingRole).toInt(), 0);
 }
 
-void TestTreeViewLooks::recordingMarks()
+void TestTreeEditing::recordingMarks()
 {
     const QModelIndex folder = m_model->index(1, 0);
     const QRect cell = m_tree->visualRect(folder);
@@ -135,23 +220,23 @@ void TestTreeViewLooks::recordingMarks()
     QVERIFY(!m_model->isRecording(folder));
 }
 
-void TestTreeViewLooks::heldLongNameShowsABalloon()
+void TestTreeEditing::heldLongNameShowsABalloon()
 {
     const QModelIndex folder = m_model->index(1, 0);
     QVERIFY(!m_tree->isTextElide(folder));
     m_model->setData(folder, QString(120, QLatin1Char('W')));
     QVERIFY(m_tree->isTextElide(folder));
     m_tree->setHoldInterval(30);
-    QTest::touchEvent(m_area, m_device.get()).press(0, rowPoint(1), m_area);
+    QTest::touchEvent(m_area, m_device).press(0, rowPoint(1), m_area);
     QTRY_VERIFY(KSToolTip::isVisible());
-    QTest::touchEvent(m_area, m_device.get()).move(0, rowPoint(1) + QPoint(0, -4), m_area);
-    QTest::touchEvent(m_area, m_device.get()).move(0, rowPoint(1) + QPoint(0, -40), m_area);
+    QTest::touchEvent(m_area, m_device).move(0, rowPoint(1) + QPoint(0, -4), m_area);
+    QTest::touchEvent(m_area, m_device).move(0, rowPoint(1) + QPoint(0, -40), m_area);
     QVERIFY(!KSToolTip::isVisible());
-    QTest::touchEvent(m_area, m_device.get()).release(0, rowPoint(1) + QPoint(0, -40), m_area);
+    QTest::touchEvent(m_area, m_device).release(0, rowPoint(1) + QPoint(0, -40), m_area);
     KSToolTip::clearInstance();
 }
 
-void TestTreeViewLooks::designAttributes()
+void TestTreeEditing::designAttributes()
 {
     for (int role = 0; role < KSVIEW::DesignAttributeCount; ++role) {
         const auto design = static_cast<KSVIEW::enumDesignAttributeRole>(role);
@@ -166,7 +251,7 @@ void TestTreeViewLooks::designAttributes()
     QCOMPARE(m_tree->visualRect(m_model->index(2, 0)).height(), 90);
 }
 
-void TestTreeViewLooks::scrollBarsAreOurs()
+void TestTreeEditing::scrollBarsAreOurs()
 {
     QVERIFY(qobject_cast<KSScrollBar*>(m_tree->verticalScrollBar()) != nullptr);
     QVERIFY(qobject_cast<KSScrollBar*>(m_tree->horizontalScrollBar()) != nullptr);
@@ -177,7 +262,7 @@ void TestTreeViewLooks::scrollBarsAreOurs()
     QTRY_VERIFY(!m_tree->verticalScrollBar()->isVisible());
 }
 
-void TestTreeViewLooks::paintsRowsToTheBottom()
+void TestTreeEditing::paintsRowsToTheBottom()
 {
     m_model->removeRows(2, 38);
     QTRY_COMPARE(m_tree->getEmptyArea(), QRect(0, 2 * ROW, m_area->width(), m_area->height() - 2 * ROW));
@@ -193,7 +278,7 @@ void TestTreeViewLooks::paintsRowsToTheBottom()
     QCOMPARE(m_tree->getEmptyArea(), m_area->rect());
 }
 
-void TestTreeViewLooks::paintsSelectionOverTheWholeRow()
+void TestTreeEditing::paintsSelectionOverTheWholeRow()
 {
     m_tree->setCurrentIndex(m_model->index(2, 0));
     const QImage image = m_area->grab().toImage();
@@ -204,7 +289,7 @@ void TestTreeViewLooks::paintsSelectionOverTheWholeRow()
     }
 }
 
-void TestTreeViewLooks::paintsUnderAWindowStyleSheet()
+void TestTreeEditing::paintsUnderAWindowStyleSheet()
 {
     const QImage plain = shot();
     m_tree->setStyleSheet(QStringLiteral(" * {font-family:'KST';}"));
@@ -216,7 +301,7 @@ void TestTreeViewLooks::paintsUnderAWindowStyleSheet()
     }
 }
 
-void TestTreeViewLooks::operationFocusSurroundsTheEditedRow()
+void TestTreeEditing::operationFocusSurroundsTheEditedRow()
 {
     Q_EMIT m_tree->editorEvent(m_model->index(2, 0));
     QImage image = m_area->grab().toImage();
@@ -226,5 +311,5 @@ void TestTreeViewLooks::operationFocusSurroundsTheEditedRow()
     QVERIFY(image.pixelColor(1, 2 * ROW + 1) != QColor(0, 186, 230));
 }
 
-QTEST_MAIN(TestTreeViewLooks)
-#include "tst_treeviewlooks.moc"
+QTEST_MAIN(TestTreeEditing)
+#include "tst_treeediting.moc"

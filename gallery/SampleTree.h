@@ -1,0 +1,32 @@
+#pragma once
+
+#include "touchui/KSModelDataFactory.h"
+
+#include <QString>
+
+#include <memory>
+#include <vector>
+
+// Folders of files for the tree of the gallery.
+class SampleTree : public KSModelDataFactory
+{
+    Q_OBJECT
+public:
+    explicit SampleTree(QObject* parent = nullptr);
+    ~SampleTree() override;
+
+    void importSourceData() override {}
+    void* getNextNode(void* node) override;
+    void* getChildNode(void* node) override;
+    void InstallItemAttribute(KSModelAttributeItem* item, void* node) override;
+
+private:
+    struct Node {
+        QString name;
+        Node* parent = nullptr;
+        int number = 0; // among its siblings
+        std::vector<std::unique_ptr<Node>> children;
+    };
+
+    Node m_root;
+};

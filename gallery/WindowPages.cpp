@@ -1,0 +1,75 @@
+// Larger parts: tabs and the tools bar.
+#include "gallery/GalleryPages.h"
+
+#include "app/ToolsBar.h"
+#include "touchui/KSPushbutton.h"
+#include "touchui/KSTabBar.h"
+#include "touchui/KSTabWidget.h"
+
+#include <QAction>
+#include <QIcon>
+#include <QLabel>
+
+namespace
+{
+
+KSTabWidget* tabWidget(const GalleryPage& page, const QRect& place, QTabWidget::TabPosition position)
+{
+    auto* tabs = new KSTabWidget(page.window.get());
+    tabs->setTabPosition(position);
+    for (const char* name : {"Preset", "User", "Off"}) {
+        auto* content = new QLabel(QStringLiteral("Page of %1").arg(QLatin1String(name)));
+        content->setAlignment(Qt::AlignCenter);
+        content->setStyleSheet(QStringLiteral("color: rgb(220, 220, 220); font-size: 24px;"));
+        tabs->addTab(content, QLatin1String(name));
+    }
+    tabs->setTabEnabled(2, false);
+    tabs->setGeometry(place);
+    return tabs;
+}
+
+ToolsBar* bar(const GalleryPage& page, int y)
+{
+    auto* undo = new QAction(page.window.get());
+    auto* redo = new QAction(page.window.get());
+    auto* tools = new ToolsBar(undo, redo, page.window.get());
+    tools->setGeometry(0, y, 1363, 67);
+    return tools;
+}
+
+} // namespace
+
+GalleryPage GalleryPages::tabs()
+{
+    GalleryPage page(QStringLiteral("tabs"), QSize(1280, 720));
+    KSTabWidget* north = tabWidget(page, QRect(20, 20, 600, 300), QTabWidget::North);
+    KSTabWidget* south = tabWidget(page, QRect(660, 20, 600, 300), QTabWidget::South);
+    KSTabWidget* west = tabWidget(page, QRect(20, 350, 600, 350), QTabWidget::West);
+    KSTabWidget* east = tabWidget(page, QRect(660, 350, 600, 350), QTabWidget::East);
+    south->setTabIcon(0, QIcon(QStringLiteral(":/FolderPicker/Titler_folder_icon")));
+    north->ksTabBar()->setTabSizeHint(1, QSize(220, 52));
+    page.pose = [north, west, east](Fingers& fingers) {
+        west->setCurrentIndex(1);
+        east->setCurrentIndex(1);
+        fingers.pressWidget(0, north->ksTabBar(), north->ksTabBar()->tabRect(1).center());
+    };
+    return page;
+}
+
+GalleryPage GalleryPages::toolsBar()
+{
+    GalleryPage page(QStringLiteral("toolsbar"), QSize(1400, 420));
+    ToolsBar* full = bar(page, 10);
+    full->changeBtnStatus(true);
+    ToolsBar* empty = bar(page, 330);
+    empty->resetToDefaultState();
+    empty->slotDisableNewTextButton(true);
+    page.pose = [full](Fingers& fingers) {
+        full->findChild<KSPushbutton*>(QStringLiteral("SafeArea"))->click();
+        auto* canvas = full->findChild<KSPushbutton*>(QStringLiteral("Canvas"));
+        fingers.pressWidget(0, canvas, QPoint(60, 30));
+        fingers.lift(0);
+        fingers.pressWidget(1, full->findChild<KSPushbutton*>(QStringLiteral("Folder")), QPoint(60, 30));
+    };
+    return page;
+}

@@ -1,0 +1,16 @@
+#pragma once
+
+#include "touchui/KSCombobox.h"
+
+// The box of the font size, whose list is wider than the narrow box.
+class SizeCombox : public KSCombobox
+{
+    Q_OBJECT
+public:
+    static constexpr int LIST_WIDTH = 110;
+
+    using KSCombobox::KSCombobox;
+
+protected:
+    void adjustPopupListSize() override;
+};

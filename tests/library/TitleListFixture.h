@@ -1,0 +1,156 @@
+// The title list in a window with the application's filter before it, fingers from a touch screen, a clock to
+// drive and an undo stack that takes its commands.
+#pragma once
+
+#include "LibraryFixture.h"
+
+#include "library/ArchiveItem.h"
+#include "library/ArchiveList.h"
+#include "library/ArchiveMenu.h"
+#include "tests/touchui/ManualClock.h"
+#include "touchui/KSAppEventFilter.h"
+#include "touchui/KSMenu.h"
+
+#include <QCoreApplication>
+#include <QLabel>
+#include <QPointingDevice>
+#include <QScrollBar>
+#include <QTest>
+#include <QUndoStack>
+#include <QWidget>
+
+class TitleListFixture : public QObject
+{
+public:
+    static constexpr int ROW = 143;             // with the gap
+    static constexpr int HANDLE_X = 523;        // in list coordinates
+    static constexpr int PICTURE_X = 150;       // likewise, on a title's picture
+    static constexpr int TEXT_X = 400;          // and on its text
+    static constexpr int HOLD_TIME = 700;       // ms
+    static constexpr int LIFT_TIME = 50;        // ms
+    static constexpr int TICK = 33;             // ms, of a flick
+    static constexpr int EDGE_SCROLL_TIME = 40; // ms
+
+    explicit TitleListFixture(QPointingDevice* device) : mDevice(device)
+    {
+        mFilter.registerLockObject(&mFilter, nullptr, LOCKOBJECT_DEFAULTMUTEX, nullptr);
+        QCoreApplication::instance()->installEventFilter(&mFilter);
+        window.setGeometry(0, 0, 1200, 1080);
+        KSScrollViewerWidget::s_mainWnd = &window;
+        KSMenu::setMainWindow(&window);
+        list = new ArchiveList(&label, false, &window);
+        list->setFixedSize(549, 997);
+        list->move(14, 66);
+        for (auto signal : {&ArchiveList::deleteCommandSignal, &ArchiveList::pasteCommandSignal,
+                            &ArchiveList::focusCommandSignal, &ArchiveList::moveCommandSignal})
+            connect(list, signal, &stack, &QUndoStack::push);
+        connect(list, &ArchiveList::signalUpdateCanvas, this, [this](const Archive* archive) {
+            canvas.append(archive ? QString::fromStdString(archive->getName()) : QStringLiteral("null"));
+        });
+        window.show();
+        if (!QTest::qWaitForWindowExposed(&window))
+            qFatal("no window");
+    }
+    ~TitleListFixture() override
+    {
+        stack.clear();
+        QCoreApplication::instance()->removeEventFilter(&mFilter);
+        KSScrollViewerWidget::s_mainWnd.clear();
+        KSMenu::setMainWindow(nullptr);
+    }
+
+    // Opens the folder and waits until every title has its picture.
+    void open(const QString& folder)
+    {
+        list->refreshArchiveList(folder);
+        const bool complete = QTest::qWaitFor([this] {
+            const ArchiveItem* last = item(list->count() - 1);
+            return !last || last->hasChildWidgets();
+        });
+        if (!complete)
+            qFatal("the titles have no pictures");
+        canvas.clear();
+    }
+
+    // Fingers, in coordinates of the list.
+    void press(int x, int y, int finger = 0) { touch().press(finger, QPoint(x, y), list); }
+    void move(int x, int y, int finger = 0) { touch().move(finger, QPoint(x, y), list); }
+    void release(int x, int y, int finger = 0) { touch().release(finger, QPoint(x, y), list); }
+    void tap(int x, int y)
+    {
+        press(x, y);
+        release(x, y);
+    }
+    void tapTitle(int row) { tap(PICTURE_X, row * ROW + 60); }
+    void hold(int x, int y)
+    {
+        press(x, y);
+        clock.advance(HOLD_TIME);
+        release(x, y);
+    }
+    // A steady motion with a tick of the flick after each step.
+    void drag(int x, int fromY, int toY, int steps)
+    {
+        for (int i = 1; i <= steps; ++i) {
+            move(x, fromY + (toY - fromY) * i / steps);
+            clock.advance(TICK);
+        }
+    }
+    // Lifts the title in this row of the widget by its handle and moves the finger to y in small steps.
+    void liftTo(int row, int y)
+    {
+        const int from = row * ROW + 65;
+        press(HANDLE_X, from);
+        clock.advance(LIFT_TIME);
+        for (int i = 1; i <= 8; ++i)
+            move(HANDLE_X, from + (y - from) * i / 8);
+    }
+    void carry(int row, int y)
+    {
+        liftTo(row, y);
+        release(HANDLE_X, y);
+    }
+
+    ArchiveMenu* menu() const { return list->findChild<ArchiveMenu*>(); }
+    // A finger on an entry of the open menu.
+    void choose(ArchiveAction::ARCHIVE_ACTION_TYPE type)
+    {
+        ArchiveMenu* open = menu();
+        const QPoint row =
+            open->getMenuItemRect(static_cast<int>(open->actions().indexOf(open->action(type)))).center();
+        QTest::touchEvent(open, mDevice).press(0, row, open);
+        QTest::touchEvent(open, mDevice).release(0, row, open);
+    }
+    void holdAndChoose(int row, ArchiveAction::ARCHIVE_ACTION_TYPE type)
+    {
+        hold(PICTURE_X, row * ROW + 60);
+        choose(type);
+    }
+
+    int value() const { return list->verticalScrollBar()->value(); }
+    int maximum() const { return list->verticalScrollBar()->maximum(); }
+    int selected() const { return list->getItemIndex(list->getSelectedArchive()); }
+    ArchiveItem* item(int index) const { return list->archiveItem(index); }
+    QStringList stems() const
+    {
+        QStringList result;
+        for (int i = 0; i < list->count(); ++i)
+            result.append(QFileInfo(item(i)->getArchiveDataPath()).completeBaseName());
+        return result;
+    }
+    bool isLocked() const { return !const_cast<KSAppEventFilter&>(mFilter).activateLockObjects().isEmpty(); }
+    QStringList takeCanvas() { return std::exchange(canvas, {}); }
+
+    ManualClock clock; // before all widgets
+    KSAppEventFilter mFilter;
+    QUndoStack stack;
+    QLabel label;
+    QWidget window;
+    ArchiveList* list = nullptr; // the window's
+    QStringList canvas;          // stems sent to the canvas; "null" for none
+
+private:
+    QTest::QTouchEventWidgetSequence touch() { return QTest::touchEvent(&window, mDevice); }
+
+    QPointingDevice* mDevice;
+};
