@@ -179,6 +179,40 @@ class Folders(harness.TitlerTest):
             self.assertEqual(self.folders(), ["Welcome", "天气"])
             self.start_titler()
 
+    def test_the_process_ends_under_two_dialogs(self):
+        os.mkdir(self.folder("empty"))
+        self.rows = self.folders()
+        self.open_picker_from_the_sub_panel()
+        self.tap_row("empty")
+        self.click_picker("Open")
+        self.titler.signal(signal.SIGTERM)
+        self.assertEqual(self.titler.wait(20 * harness.SLOW), 0)
+        self.assertEqual(os.listdir(self.folder("empty")), [])
+
+    def test_no_template_leads_back_to_the_picker(self):
+        os.mkdir(self.folder("empty"))
+        self.rows = self.folders()
+        self.command("register")
+        start = self.appliance.mark()
+        self.command("create 7")
+        self.wait_shown()
+        # Folders are made once one has been chosen.
+        self.click_picker("New Folder")
+        self.assertEqual(self.calls("SoftKeyBoardController", "show", start), [])
+        self.tap_row("empty")
+        self.click_picker("Open")
+        self.click(*harness.TEMPLATE_BUTTONS["Cancel"])
+        self.display.wait_until_still()
+        self.tap_row("天气")
+        self.click_picker("Open")
+        self.choose_template(1)
+        self.wait_titles(self.folder("天气"), 3)
+        self.display.wait_until_still()
+        self.close_window()
+        result = self.appliance.wait_event("callback", 20 * harness.SLOW, start)
+        self.assertEqual((result["path"], result["count"]), (self.folder("天气"), 1))
+        self.assertEqual([name for name in os.listdir(self.folder("empty")) if name.endswith(".xml")], [])
+
 
 if __name__ == "__main__":
     unittest.main()
