@@ -123,6 +123,11 @@ class Folders(harness.TitlerTest):
         self.close_window()
         self.assertEqual(self.calls("FileManagerController", "titlerEditEndStatus", start)[-1]["path"],
                          self.folder("Copie"))
+        with open(os.path.join(self.keep, "k2_ope.log"), encoding="utf-8") as stream:
+            log = [line for line in stream if "Folder Area" in line]
+        for text in ("Tap New Folder Button", "Tap Duplicate Button", "Select Folder or File", "Tap Open Button",
+                     "Tap Cancel Button"):
+            self.assertTrue(any(text in line for line in log), f"{text} is not in the log")
 
     def test_names_that_are_refused(self):
         self.open_picker_from_the_sub_panel()
