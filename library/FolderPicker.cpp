@@ -38,7 +38,10 @@ const int SEPARATOR_HEIGHT = 4;
 const int DATE_WIDTH = 250;
 const int BUTTON_SPACE = 8;
 constexpr QSize BUTTON_SIZE(160, 48);
+// Inside the frame, which is dark by itself.
 constexpr QRect MASK_AREA(7, 9, 1088 - 14, 742 - 18);
+constexpr QColor FRAME_COLOR(17, 17, 17);
+constexpr QColor FRAME_LINE_COLOR(85, 85, 85);
 
 const char BUTTON_IMAGES[] =
     "TextToolPanel_Buttons:Button_48_Rest_Left:Button_48_Rest_Center:Button_48_Rest_Right:"
@@ -282,7 +285,14 @@ void FolderPicker::paintEvent(QPaintEvent* event)
 {
     QDialog::paintEvent(event);
     QPainter painter(this);
+    painter.fillRect(rect(), FRAME_COLOR);
+    painter.fillRect(MASK_AREA, QColor(50, 50, 50));
+    painter.setClipRect(MASK_AREA);
     painter.drawPixmap(0, 0, mBackground);
+    painter.setClipping(false);
+    painter.setPen(FRAME_LINE_COLOR);
+    painter.drawRect(MASK_AREA.adjusted(0, 0, -1, -1));
+    painter.drawRect(rect().adjusted(0, 0, -1, -1));
     const QImage line(QStringLiteral(":/Separator_H"));
     for (const QPoint& start : {STARTPOINT_OF_TOP_HSEPARATOR, STARTPOINT_OF_BOTTOM_HSEPARATOR})
         painter.drawImage(QRect(start, QSize(HSEPARATOR_LENGTH, SEPARATOR_HEIGHT)), line);

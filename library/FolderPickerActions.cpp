@@ -183,9 +183,9 @@ void FolderPicker::pressedFolder(QModelIndex indexPress)
     updateThumbnailArea(mFactory->getNodeInfo(item->dataItem()->getSourceData()).filePath());
 }
 
-void FolderPicker::slotCurrentChangedByTouch(QModelIndex index)
+void FolderPicker::slotCurrentChangedByTouch(QModelIndex)
 {
-    LOG_USER_OPERATE(L"Folder Area", 200, L"Tap " + nameOf(index).toStdWString());
+    logTap(L"Select Folder or File");
 }
 
 void FolderPicker::startEditing(QModelIndex index)

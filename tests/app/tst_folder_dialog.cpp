@@ -10,6 +10,7 @@
 #include "canvas/CanvasScene.h"
 #include "library/ArchiveList.h"
 #include "library/FolderPicker.h"
+#include "library/TemplatePicker.h"
 #include "tests/library/LibraryFixture.h"
 #include "touchui/KSInputContext.h"
 #include "touchui/KSPushbutton.h"
@@ -43,6 +44,7 @@ private slots:
     void noticesOfTheFileManager();
     void noticesWhileHidden();
     void renameOfTheFolderThatIsEdited();
+    void noTemplateLeadsBackToThePicker();
     void masksLieOnTheDialog();
     void languageAndFont();
 
@@ -301,6 +303,34 @@ void tst_folder_dialog::renameOfTheFolderThatIsEdited()
     QCOMPARE(QString::fromStdString(scene->archive()->getPath()), path("later") + "/t2.xml");
     QCOMPARE(picker()->currentFolderName(), QStringLiteral("later"));
     QVERIFY(!QFileInfo::exists(path("news")));
+}
+
+void tst_folder_dialog::noTemplateLeadsBackToThePicker()
+{
+    mFiles.makeFolder("empty");
+    auto* templates = mWindow->findChild<TemplatePicker*>();
+    bool shown = false;
+    mSiblings.forget();
+    inDialog([this] { request(QString(), _titler_paramter::SUB_PANEL); },
+             [&] {
+                 choose("empty");
+                 QTimer::singleShot(0, templates, [&] {
+                     shown = templates->isVisible() && picker()->isVisible() && isMasked(picker());
+                     // A box of another process lies on the upper dialog alone.
+                     ShowMessageController::getInstance()->showMessageOpacityWidget();
+                     ShowMessageController::getInstance()->hideMessageOpacityWidget();
+                     templates->reject();
+                 });
+                 press("openFolderButton");
+                 QVERIFY(picker()->isVisible());
+                 QVERIFY(!isMasked(picker()));
+                 QVERIFY(isMasked(mWindow));
+                 choose("news");
+                 press("openFolderButton");
+             });
+    QVERIFY(shown);
+    QCOMPARE(list()->getCurrentPath(), path("news"));
+    QVERIFY(QDir(path("empty")).entryList({"*.xml"}, QDir::Files).isEmpty());
 }
 
 void tst_folder_dialog::masksLieOnTheDialog()

@@ -3,6 +3,7 @@
 #include "FolderPickerFixture.h"
 
 #include <QLabel>
+#include <QRandomGenerator>
 
 class TestFolderChanges : public QObject
 {
@@ -354,7 +355,123 @@ private slots:
         QCOMPARE(f.folders(), QStringList({"a", "b", "c"}));
     }
 
+    // --- All of it, in any order ----------------------------------------------------------------------
+
+    // Whatever was done: what is on the disk is listed, and nothing is half open.
+    void inAnyOrder_data()
+    {
+        QTest::addColumn<quint32>("seed");
+        for (const quint32 seed : {1U, 20261121U, 77U})
+            QTest::addRow("%u", seed) << seed;
+    }
+
+    void inAnyOrder()
+    {
+        QFETCH(quint32, seed);
+        QRandomGenerator random(seed);
+        f.tree()->setHoldInterval(1);
+        for (int step = 0; step < 600; ++step) {
+            const QString done = randomStep(random);
+            QCoreApplication::processEvents();
+            QVERIFY2(!QTest::currentTestFailed(), qPrintable(done));
+            const bool editing = f.picker->editor() != nullptr;
+            QCOMPARE(f.picker->editAction() != FolderPicker::FOLDER_EDIT_NONE, editing);
+            QCoreApplication::sendPostedEvents(nullptr, QEvent::DeferredDelete);
+            QCOMPARE(f.tree()->findChildren<FolderEditor*>().size(), editing ? 1 : 0);
+            QVERIFY2(f.picker->isVisible() || !editing, qPrintable(done));
+            if (!f.picker->isVisible())
+                continue;
+            const QStringList names = f.names();
+            const QStringList folders = f.folders();
+            for (const QString& folder : folders) {
+                const bool isListed = names.contains(folder);
+                QVERIFY2(isListed, qPrintable(done + ": " + folder + " is not in " + names.join('|')));
+            }
+            QVERIFY2(names.size() - folders.size() <= 1 + mRefused,
+                     qPrintable(done + ": " + names.join('|')));
+        }
+        // Read anew, it is the disk exactly.
+        f.picker->updateTreeView();
+        QCoreApplication::processEvents();
+        QStringList names = f.names();
+        names.sort();
+        QStringList folders = f.folders();
+        folders.sort();
+        QCOMPARE(names, folders);
+    }
+
 private:
+    QString randomStep(QRandomGenerator& random)
+    {
+        const QStringList pool = {"a", "B", "b", "news", "NEWS", QStringLiteral("天气"), "x  ", "y", "q", ""};
+        const QString name = pool.at(random.bounded(pool.size()));
+        const QStringList folders = f.folders();
+        const QString folder = folders.isEmpty() ? QString() : folders.at(random.bounded(folders.size()));
+        const int rows = f.model()->rowCount();
+        const QModelIndex row = rows > 0 ? f.model()->index(random.bounded(rows), 0) : QModelIndex();
+        const char* buttons[] = {"newFolderButton", "duplicateFolderButton", "openFolderButton",
+                                 "cancelFolderButton"};
+        const int kind = random.bounded(16);
+        if (!f.picker->isVisible()) {
+            f.picker->updateTreeView();
+            f.picker->show();
+            f.picker->activateWindow();
+            return QStringLiteral("open");
+        }
+        switch (kind) {
+        case 0:
+        case 1:
+            f.tapButton(buttons[random.bounded(4)]);
+            break;
+        case 2:
+        case 3:
+            f.tapButton(buttons[random.bounded(2)]);
+            break;
+        case 4:
+        case 5:
+        case 6:
+            f.enter(name);
+            break;
+        case 7:
+            f.input()->sendInputStringOnTextChanged(random.bounded(2) ? L"a/b" : L"fine");
+            break;
+        case 8:
+            f.closeKeyboard();
+            break;
+        case 9:
+            if (f.picker->editor())
+                f.escape();
+            break;
+        case 10:
+            f.answerClash();
+            break;
+        case 11:
+            if (!folder.isEmpty() && !name.isEmpty() && !folders.contains(name, Qt::CaseInsensitive))
+                renameOutside(folder, name);
+            break;
+        case 12:
+            if (folders.size() > 3) {
+                // A copy whose source goes leaves a row without a folder.
+                mRefused += f.picker->editAction() == FolderPicker::FOLDER_EDIT_DUPLICATE ? 1 : 0;
+                deleteOutside(folder);
+            }
+            break;
+        case 13:
+            if (row.isValid() && f.tree()->visualRect(row).isValid()) {
+                const QPoint point = f.tree()->viewport()->mapTo(f.picker.get(), f.place(row));
+                f.touch->press(f.picker.get(), point);
+                QTest::qWait(5);
+                f.touch->lift(f.picker.get(), point);
+            }
+            break;
+        default:
+            if (row.isValid() && f.tree()->visualRect(row).isValid())
+                f.tap(row);
+            break;
+        }
+        return QStringLiteral("%1 %2 %3").arg(kind).arg(name, folder);
+    }
+
     void notify(const QString& before, const QString& after)
     {
         FileManagerDefine::tagChangeFolderNameParam param;
@@ -374,6 +491,7 @@ private:
     }
     QLabel* thumbnail() const { return f.picker->findChild<QLabel*>("folderThumbnail"); }
 
+    int mRefused = 0; // rows that may stand for no folder
     FolderPickerFixture f;
 };
 
