@@ -176,8 +176,12 @@ class Display:
 
     def find_window(self, title):
         """The id of the visible window with exactly this title, or None."""
-        done = subprocess.run(["xdotool", "search", "--onlyvisible", "--name", f"^{re.escape(title)}$"],
-                              env=self.environment, capture_output=True, text=True, check=False)
+        # A search in which another window, a menu or a dialog, goes away breaks off.
+        for _ in range(5):
+            done = subprocess.run(["xdotool", "search", "--onlyvisible", "--name", f"^{re.escape(title)}$"],
+                                  env=self.environment, capture_output=True, text=True, check=False)
+            if "X Error" not in done.stderr:
+                break
         ids = done.stdout.split()
         return ids[-1] if done.returncode == 0 and ids else None
 

@@ -4,6 +4,7 @@ Every test gets a fresh data path, log folder, display and pair of processes. Wh
 logs and the picture differences stay under tests/e2e/ in the build tree.
 """
 import atexit
+import fcntl
 import json
 import os
 import re
@@ -57,18 +58,27 @@ def pngdiff(*arguments):
     return json.loads(done.stdout)
 
 
-def free_port_offset():
-    """An offset at which all ports are free. It starts at a place of this process: several suites can run at once."""
-    offsets = [20000 + 10 * ((os.getpid() + number) % 1000) for number in range(1000)]
-    for offset in offsets:
-        try:
-            for port in (session.MAIN_PORT, session.SUB_PANEL_PORT, session.TITLER_PORT):
-                with socket.socket() as probe:
-                    probe.bind(("127.0.0.1", port + offset))
-        except OSError:
-            continue
-        return offset
-    raise session.SessionError("no free ports")
+class PortOffset:
+    """An offset at which all ports are free, kept from other suites on this machine until it is released."""
+
+    def __init__(self):
+        # The search starts at a place of this process: several suites can run at once.
+        for number in range(1000):
+            self.value = 20000 + 10 * ((os.getpid() + number) % 1000)
+            path = os.path.join(tempfile.gettempdir(), f"titler-ports-{self.value}.lock")
+            self.lock = open(path, "w", encoding="ascii")  # pylint: disable=consider-using-with
+            try:
+                fcntl.flock(self.lock, fcntl.LOCK_EX | fcntl.LOCK_NB)
+                for port in (session.MAIN_PORT, session.SUB_PANEL_PORT, session.TITLER_PORT):
+                    with socket.socket() as probe:
+                        probe.bind(("127.0.0.1", port + self.value))
+                return
+            except OSError:
+                self.lock.close()
+        raise session.SessionError("no free ports")
+
+    def release(self):
+        self.lock.close()
 
 
 class Title:
@@ -110,7 +120,9 @@ class TitlerTest(unittest.TestCase):
         # The platform's buffers for paths are short, so the data path is, too.
         self.work = tempfile.mkdtemp(prefix="titler-")
         self.addCleanup(shutil.rmtree, self.work, ignore_errors=True)
-        self.offset = free_port_offset()
+        ports = PortOffset()
+        self.addCleanup(ports.release)
+        self.offset = ports.value
         self.environment = session.program_environment(
             BUILD, K2SYS_AC_ROOT="", K2SYS_AC_DATA=os.path.join(self.work, "d"), K2SYS_LOG_DIR=self.keep,
             K2SYS_PORT_OFFSET=self.offset, **self.environment_changes)

@@ -52,7 +52,10 @@ class HostilePeer(harness.TitlerTest):
         if not self.window():
             return
         self.display.wait_until_still(30 * harness.SLOW)
-        self.close_window()
+        # A request without a path has the folder picker before the window, and without it nothing is hit.
+        self.click_picker("Cancel")
+        if self.window():
+            self.close_window()
 
     def assert_unharmed(self):
         """The titler answers, shows a title as before, and has neither changed files nor taken memory."""
@@ -105,7 +108,7 @@ class HostilePeer(harness.TitlerTest):
         self.wait_handled(connection)
         self.assert_unharmed()
 
-    def test_any_payload_of_a_create_request_opens_the_last_folder_and_nothing_else(self):
+    def test_any_payload_of_a_create_request_opens_the_folder_picker_and_nothing_else(self):
         connection = self.connect()
         for payload in (b"\xd3", b"\xc1", self.rng.randbytes(wire.MAX_PAYLOAD), b"\xdb\xff\xff\xff\xff"):
             connection.call(wire.SHOW_CREATE, payload)
