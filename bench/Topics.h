@@ -8,6 +8,7 @@ namespace Topics
 {
 
 void addFilter(PairList& list);
+void addList(PairList& list, const BenchEnvironment& environment);
 void addMessaging(PairList& list);
 void addPanel(PairList& list);
 void addPictures(PairList& list, const BenchEnvironment& environment);

@@ -73,6 +73,7 @@ int runPairs(std::vector<char*> arguments, const BenchEnvironment& environment)
     Topics::addTyping(list);
     Topics::addPanel(list);
     Topics::addTitleFiles(list, environment);
+    Topics::addList(list, environment);
     Topics::addFilter(list);
     Topics::addMessaging(list);
     Topics::addStart(list);

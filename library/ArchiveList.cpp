@@ -178,8 +178,12 @@ void ArchiveList::slotAddArchiveData()
 void ArchiveList::slotAddOneArchiveData(ArchiveItem* item)
 {
     // The folder may have changed while the call was queued.
-    if (mAllItems.contains(item))
-        item->initArchiveItemChildWidget();
+    if (!mAllItems.contains(item))
+        return;
+    item->initArchiveItemChildWidget();
+    // Queued calls come before updates: what is on screen does not wait for the rest of a long folder.
+    if (getItemIndex(item) == lastVisibleItem())
+        viewport()->repaint();
 }
 
 void ArchiveList::initArchiveListRefreshData()

@@ -30,7 +30,7 @@ QPoint pressPosition(const QEvent* event)
 } // namespace
 
 KSBaseItemWidget::KSBaseItemWidget(QWidget* parent)
-    : KSPushbutton(parent), m_handle(new QLabel(this)), m_shadow(new QGraphicsDropShadowEffect(this))
+    : KSPushbutton(parent), m_shadow(new QGraphicsDropShadowEffect(this))
 {
     KSBaseItemWidget::setNormalStyle();
     setFocusPolicy(Qt::NoFocus);
@@ -39,10 +39,17 @@ KSBaseItemWidget::KSBaseItemWidget(QWidget* parent)
     m_shadow->setOffset(0, 0);
     m_shadow->setEnabled(false);
     setGraphicsEffect(m_shadow);
-    m_handle->setPixmap(QPixmap(HANDLE_PICTURE));
-    m_handle->setStyleSheet(QStringLiteral("background-color: rgb(51, 51, 51)"));
-    m_handle->setAttribute(Qt::WA_TransparentForMouseEvents);
-    m_handle->hide();
+}
+
+// Most rows are never dragged.
+QLabel* KSBaseItemWidget::makeHandle()
+{
+    auto* handle = new QLabel(this);
+    handle->setPixmap(QPixmap(HANDLE_PICTURE));
+    handle->setStyleSheet(QStringLiteral("background-color: rgb(51, 51, 51)"));
+    handle->setAttribute(Qt::WA_TransparentForMouseEvents);
+    handle->hide();
+    return handle;
 }
 
 KSBaseItemWidget::~KSBaseItemWidget() = default;
@@ -167,10 +174,12 @@ void KSBaseItemWidget::setDragFlag(bool dragFlag)
     m_dragFlag = dragFlag;
     updateDragArea();
     if (dragFlag) {
+        if (!m_handle)
+            m_handle = makeHandle();
         m_handle->setGeometry(QRect(getHandlePos(), QSize(HANDLE_SIZE, HANDLE_SIZE)));
         m_handle->show();
         m_handle->raise();
-    } else {
+    } else if (m_handle) {
         m_handle->hide();
     }
 }
@@ -179,7 +188,8 @@ void KSBaseItemWidget::setDragFlagAlignment(DragFlagAlignment alignment)
 {
     m_alignment = alignment;
     updateDragArea();
-    m_handle->move(getHandlePos());
+    if (m_handle)
+        m_handle->move(getHandlePos());
     update();
 }
 
@@ -273,7 +283,8 @@ void KSBaseItemWidget::resizeEvent(QResizeEvent* event)
 {
     KSPushbutton::resizeEvent(event);
     updateDragArea();
-    m_handle->move(getHandlePos());
+    if (m_handle)
+        m_handle->move(getHandlePos());
     if (size() == m_lastSize)
         return;
     m_lastSize = size();

@@ -78,6 +78,7 @@ private:
     void takeChild(QPointer<QWidget>& place, QWidget* child);
     void updateDragArea();
     int handleTop() const;
+    QLabel* makeHandle();
 
     QPointer<QWidget> m_left;
     QPointer<QWidget> m_right;

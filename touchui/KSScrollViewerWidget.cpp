@@ -6,6 +6,8 @@
 #include "touchui/ScrollViewerDrag.h"
 
 #include <QKeyEvent>
+#include <QPaintEvent>
+#include <QPainter>
 #include <QResizeEvent>
 #include <QScopedValueRollback>
 #include <QWheelEvent>
@@ -13,6 +15,7 @@
 namespace
 {
 
+const QColor BACKGROUND(51, 51, 51);
 constexpr int DEFAULT_WIDTH = 543;
 constexpr int DEFAULT_HEIGHT = 998;
 constexpr int BAR_LEFT = 3;
@@ -42,6 +45,8 @@ KSScrollViewerWidget::KSScrollViewerWidget(QWidget* parent)
     setStyleSheet(s_scrollBarStyle);
     setAttribute(Qt::WA_AcceptTouchEvents);
     viewport()->setAttribute(Qt::WA_AcceptTouchEvents);
+    // Only what is opaque is scrolled on the screen without being painted again.
+    viewport()->setAttribute(Qt::WA_OpaquePaintEvent);
     setWidget(m_board->panel());
     buildBars();
 
@@ -490,6 +495,19 @@ void KSScrollViewerWidget::wheelChange(bool move, int index)
     if (move)
         moveToWidgetItem(qMax(index, 0));
     Q_EMIT signalVisibleItemsChange();
+}
+
+void KSScrollViewerWidget::paintEvent(QPaintEvent* event)
+{
+    QPainter painter(viewport());
+    painter.fillRect(event->rect(), BACKGROUND);
+}
+
+void KSScrollViewerWidget::scrollContentsBy(int dx, int dy)
+{
+    viewport()->scroll(dx, dy);
+    m_bar->move(m_bar->pos() - QPoint(dx, dy));
+    QScrollArea::scrollContentsBy(dx, dy);
 }
 
 void KSScrollViewerWidget::keyPressEvent(QKeyEvent* event)

@@ -177,6 +177,9 @@ protected:
     void wheelEvent(QWheelEvent* event) override;
     void keyPressEvent(QKeyEvent* event) override;
     void resizeEvent(QResizeEvent* event) override;
+    void paintEvent(QPaintEvent* event) override;
+    // Moves what is on screen already and paints the rest only.
+    void scrollContentsBy(int dx, int dy) override;
     // A hidden list has no finger on it.
     void hideEvent(QHideEvent* event) override;
     bool focusNextPrevChild(bool next) override;

@@ -5,6 +5,7 @@
 
 #include <QGraphicsEffect>
 #include <QLabel>
+#include <QScreen>
 #include <QSignalSpy>
 #include <QVBoxLayout>
 #include <QWheelEvent>
@@ -31,6 +32,7 @@ private Q_SLOTS:
     void barShowsWhenNeeded();
     void barSides();
     void barsGoTogether();
+    void scrolledIsWhatWouldBePainted();
     void moving_data();
     void moving();
     void lastVisible();
@@ -264,6 +266,38 @@ void TestScrollViewerLayout::barsGoTogether()
     QCOMPARE(m->value(), m->maximum());
     m->mList->slotSetScrollBarValue(-5);
     QCOMPARE(m->mList->getVScrollBar()->value(), 0);
+}
+
+// What is moved on the screen must be what a full painting gives.
+void TestScrollViewerLayout::scrolledIsWhatWouldBePainted()
+{
+    QWidget above(&m->mWindow); // floats over a part of the list, as a lifted row does
+    above.setGeometry(300, 250, 120, 60);
+    above.setStyleSheet(QStringLiteral("background: rgb(200, 0, 0)"));
+    above.hide();
+    for (int i = 0; i < 20; ++i) {
+        auto* row = new Row(QString::number(i));
+        row->setStyleSheet(QStringLiteral("QPushButton { background: rgb(%1, 80, 40) }").arg(10 * i + 40));
+        row->setText(QString::number(i));
+        m->mList->addWidgetItem(row, -1);
+    }
+    const auto onScreen = [this] {
+        return m->mWindow.screen()
+            ->grabWindow(m->mWindow.winId())
+            .toImage()
+            .convertToFormat(QImage::Format_RGB32);
+    };
+    const auto painted = [this] { return m->mWindow.grab().toImage().convertToFormat(QImage::Format_RGB32); };
+    for (const bool covered : {false, true}) {
+        above.setVisible(covered);
+        above.raise();
+        for (const int value : {0, 24, 130, 131, 900, 876, 1500, 20, 0}) {
+            m->mList->slotSetScrollBarValue(value);
+            QCOMPARE(m->value(), value);
+            QTRY_VERIFY2(onScreen() == painted(), qPrintable(QString::number(value)));
+            QVERIFY(!onScreen().isNull());
+        }
+    }
 }
 
 void TestScrollViewerLayout::moving_data()
