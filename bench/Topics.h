@@ -7,6 +7,7 @@ class BenchEnvironment;
 namespace Topics
 {
 
+void addEditing(PairList& list);
 void addFilter(PairList& list);
 void addMessaging(PairList& list);
 void addPictures(PairList& list, const BenchEnvironment& environment);

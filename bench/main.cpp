@@ -71,6 +71,7 @@ int runPairs(std::vector<char*> arguments, const BenchEnvironment& environment)
     Topics::addRendering(list, environment);
     Topics::addPictures(list, environment);
     Topics::addTyping(list);
+    Topics::addEditing(list);
     Topics::addTitleFiles(list, environment);
     Topics::addFilter(list);
     Topics::addMessaging(list);
