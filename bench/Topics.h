@@ -7,6 +7,7 @@ class BenchEnvironment;
 namespace Topics
 {
 
+void addEditing(PairList& list);
 void addFilter(PairList& list);
 void addList(PairList& list, const BenchEnvironment& environment);
 void addMessaging(PairList& list);

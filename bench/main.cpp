@@ -72,6 +72,7 @@ int runPairs(std::vector<char*> arguments, const BenchEnvironment& environment)
     Topics::addPictures(list, environment);
     Topics::addTyping(list);
     Topics::addPanel(list);
+    Topics::addEditing(list);
     Topics::addTitleFiles(list, environment);
     Topics::addList(list, environment);
     Topics::addFilter(list);

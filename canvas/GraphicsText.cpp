@@ -3,14 +3,15 @@
 #include "canvas/IInputLanguageSource.h"
 #include "canvas/StyleDocument.h"
 #include "canvas/TextPainter.h"
+#include "canvas/TextShadowEffect.h"
 #include "canvas/TextStyleEditor.h"
 #include "canvas/TouchTextEditor.h"
 #include "support/LogManager.h"
 #include "touchui/KSInputContext.h"
 #include "touchui/KSSoftKeyboardCursorSettingEvent.h"
 
+#include <QAbstractEventDispatcher>
 #include <QClipboard>
-#include <QGraphicsDropShadowEffect>
 #include <QGraphicsScene>
 #include <QGraphicsSceneContextMenuEvent>
 #include <QGraphicsSceneMouseEvent>
@@ -18,9 +19,30 @@
 #include <QKeyEvent>
 #include <QMimeData>
 #include <QPainter>
+#include <QStyleHints>
 #include <QTextCursor>
 #include <QTextDocument>
 #include <QTextOption>
+#include <algorithm>
+
+namespace
+{
+
+// The document's own caret is not painted, so its blinking would repaint the object for nothing.
+bool isBlinkOfCaret(QObject* watched, const QEvent* event)
+{
+    if (event->type() != QEvent::Timer)
+        return false;
+    const int blink = QGuiApplication::styleHints()->cursorFlashTime() / 2;
+    const int id = static_cast<const QTimerEvent*>(event)->timerId();
+    const QList<QAbstractEventDispatcher::TimerInfo> timers =
+        QAbstractEventDispatcher::instance()->registeredTimers(watched);
+    return std::any_of(timers.begin(), timers.end(), [blink, id](const auto& timer) {
+        return timer.timerId == id && timer.interval == blink;
+    });
+}
+
+} // namespace
 
 GraphicsText::GraphicsText(TText* record, int id, QGraphicsItem* parent, QGraphicsScene* scene)
     : QGraphicsTextItem(parent), m_styles(std::make_unique<StyleDocument>())
@@ -62,13 +84,16 @@ void GraphicsText::initDataForGraphicsText()
     option.setWrapMode(QTextOption::NoWrap);
     document()->setDefaultTextOption(option);
 
-    m_shadowEffect = new QGraphicsDropShadowEffect;
+    m_shadowEffect = new TextShadowEffect(*this);
     m_shadowEffect->setColor(DROP_SHADOW_COLOR);
     m_shadowEffect->setOffset(0.0, 0.0);
     m_shadowEffect->setEnabled(false);
     setGraphicsEffect(m_shadowEffect);
 
     installEventFilter(this);
+    const QObjectList parts = children();
+    for (QObject* part : parts)
+        part->installEventFilter(this);
     if (IInputLanguageSource* source = IInputLanguageSource::instance()) {
         connect(source, &IInputLanguageSource::signalsInputLanguageInfo, this,
                 &GraphicsText::slotObjectDisplayInputLanguage);
@@ -451,6 +476,8 @@ void GraphicsText::customEvent(QEvent* event)
 
 bool GraphicsText::eventFilter(QObject* watched, QEvent* event)
 {
+    if (watched != this && watched->parent() == this && isBlinkOfCaret(watched, event))
+        return true;
     if (watched == this && !m_parentObject && m_touchEditor->filter(event))
         return true;
     return QGraphicsTextItem::eventFilter(watched, event);

@@ -47,6 +47,7 @@ TextPainter::TextPainter(GraphicsText& item) : m_item(item), m_carets(*item.docu
 void TextPainter::invalidate()
 {
     m_valid = false;
+    ++m_version;
     m_carets.invalidate();
 }
 

@@ -30,6 +30,8 @@ public:
 
     // Call when text, styles or layout changed.
     void invalidate();
+    // Another number whenever what is drawn may have changed.
+    quint64 contentVersion() const { return m_version; }
     CaretGeometry& carets() { return m_carets; }
 
     void drawItemText(QPainter* painter);
@@ -89,5 +91,6 @@ private:
     std::vector<Step> m_steps;
     std::vector<CaretGeometry::Caret> m_blockCarets;
     Frame m_frame;
+    quint64 m_version = 0;
     bool m_valid = false;
 };

@@ -53,6 +53,7 @@ private slots:
     void emojiAndMarkSurvive();
     void cursorMessages_data();
     void cursorMessages();
+    void cursorInsideACharacter();
     void cursorMessageDuringADrag();
     void closeOnText();
     void closeOnEmptiedObject();
@@ -367,6 +368,28 @@ void tst_keyboardediting::cursorMessages()
     QCOMPARE(shown.size(), qMax(1, qAbs(anchor - position)));
     QCOMPARE(shown.first(), 60 + first);
     QCOMPARE(canvas.stack.count(), 0);
+}
+
+// Keyboards may count characters otherwise; the cursor stands before a pair, never in it.
+void tst_keyboardediting::cursorInsideACharacter()
+{
+    TouchCanvas canvas(m_device);
+    canvas.show();
+    canvas.open({makeRecord(QString::fromUtf8("a😀b"))});
+    GraphicsText* item = canvas.text(1);
+    canvas.edit(1, canvas.caretIn(*item, 0));
+    sendCursor(0, 0, 2, 0);
+    QCOMPARE(item->textCursor().position(), 1);
+    sendText(QStringLiteral("x"));
+    QCOMPARE(item->toPlainText(), QString::fromUtf8("ax😀b"));
+    sendCursor(3, 5, 5, 1);
+    QCOMPARE(item->textCursor().selectionStart(), 2);
+    QCOMPARE(item->textCursor().selectionEnd(), 5);
+    sendText(QStringLiteral("y"));
+    QCOMPARE(item->toPlainText(), QStringLiteral("axy"));
+    QVERIFY(inStep(*item));
+    sendClose();
+    QCOMPARE(canvas.saved()->getText()[0]->getText(), std::string("axy"));
 }
 
 // While a finger drags a selection, the keyboard's answer to it must not move the cursor.

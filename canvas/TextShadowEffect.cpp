@@ -1,0 +1,62 @@
+#include "canvas/TextShadowEffect.h"
+
+#include "canvas/GraphicsText.h"
+#include "canvas/TextPainter.h"
+
+#include <QPaintDevice>
+#include <QPainter>
+#include <QTextCursor>
+#include <cmath>
+
+namespace
+{
+
+// Pixels; twice the canvas. Larger objects are mostly out of sight.
+constexpr qint64 LargestPicture = 2LL * 1480 * 920;
+
+} // namespace
+
+TextShadowEffect::TextShadowEffect(GraphicsText& item) : m_item(item)
+{
+}
+
+bool TextShadowEffect::isWorthKeeping(const QPainter& painter) const
+{
+    return painter.device()->devType() == QInternal::Widget &&
+           m_item.getBoundingLineStatus() != TextObjectConstants::FocusEdit &&
+           !m_item.textCursor().hasSelection();
+}
+
+// The base class draws at the item's place on the device; here that place is the picture.
+void TextShadowEffect::drawPicture(const QPainter& painter, QRect area)
+{
+    m_picture = QPixmap(area.size());
+    m_picture.fill(Qt::transparent);
+    QPainter picturePainter(&m_picture);
+    picturePainter.setRenderHints(painter.renderHints());
+    picturePainter.setWindow(area);
+    QGraphicsDropShadowEffect::draw(&picturePainter);
+}
+
+void TextShadowEffect::draw(QPainter* painter)
+{
+    const QRect area = boundingRectFor(sourceBoundingRect(Qt::DeviceCoordinates)).toAlignedRect();
+    if (!isWorthKeeping(*painter) || qint64(area.width()) * area.height() > LargestPicture) {
+        m_picture = QPixmap();
+        QGraphicsDropShadowEffect::draw(painter);
+        return;
+    }
+    const QTransform transform = painter->worldTransform();
+    const QPoint place(int(std::floor(transform.dx())), int(std::floor(transform.dy())));
+    const Key key{m_item.textPainter().contentVersion(),
+                  transform * QTransform::fromTranslate(-place.x(), -place.y()), offset(), blurRadius(),
+                  color()};
+    if (m_picture.isNull() || !(key == m_key)) {
+        drawPicture(*painter, area);
+        m_key = key;
+        m_area = area.translated(-place);
+    }
+    painter->setWorldTransform(QTransform());
+    painter->drawPixmap(m_area.topLeft() + place, m_picture);
+    painter->setWorldTransform(transform);
+}
