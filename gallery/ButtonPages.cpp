@@ -139,7 +139,7 @@ GalleryPage GalleryPages::slidersAndRadioButtons()
     page.caption(QPoint(20, 452), QStringLiteral("held, with its balloon"));
     KSSLider* held = slider(page, images, QRect(20, 540, 400, 60));
     held->setValue(6);
-    page.caption(QPoint(470, 12), QStringLiteral("upright, without pictures"));
+    page.caption(QPoint(450, 12), QStringLiteral("upright, plain"));
     slider(page, QString(), QRect(500, 40, 60, 250), Qt::Vertical)->setValue(4);
 
     page.caption(QPoint(620, 12), QStringLiteral("radio buttons: at rest"));

@@ -14,12 +14,17 @@ constexpr qint64 DEVICE_ID = 77;
 } // namespace
 
 Fingers::Fingers()
-    : m_device(std::make_unique<QPointingDevice>(
-          QStringLiteral("gallery touch screen"), DEVICE_ID, QInputDevice::DeviceType::TouchScreen,
-          QPointingDevice::PointerType::Finger,
-          QInputDevice::Capability::Position | QInputDevice::Capability::Area, MOST_FINGERS, 0))
 {
-    QWindowSystemInterface::registerInputDevice(m_device.get());
+    plugIn();
+}
+
+void Fingers::plugIn()
+{
+    m_devices.push_back(std::make_unique<QPointingDevice>(
+        QStringLiteral("gallery touch screen"), DEVICE_ID, QInputDevice::DeviceType::TouchScreen,
+        QPointingDevice::PointerType::Finger,
+        QInputDevice::Capability::Position | QInputDevice::Capability::Area, MOST_FINGERS, 0));
+    QWindowSystemInterface::registerInputDevice(m_devices.back().get());
 }
 
 Fingers::~Fingers()
@@ -36,7 +41,7 @@ void Fingers::press(int finger, QWidget* window, const QPoint& position)
     if (window == nullptr || window->window()->windowHandle() == nullptr) {
         return;
     }
-    m_down.insert(finger, {position, window->window()->windowHandle()});
+    m_down.insert(finger, {m_nextId++, position, window->window()->windowHandle()});
     send(finger, QEventPoint::State::Pressed);
 }
 
@@ -80,7 +85,9 @@ void Fingers::cancel()
     m_down.clear();
     m_time += STEP;
     QWindowSystemInterface::handleTouchCancelEvent<QWindowSystemInterface::SynchronousDelivery>(
-        window, m_time, m_device.get(), Qt::NoModifier);
+        window, m_time, m_devices.back().get(), Qt::NoModifier);
+    // Qt keeps the targets of fingers that were taken away, and would find them again for later ones.
+    plugIn();
 }
 
 // One event tells of all fingers, of which one has changed.
@@ -89,7 +96,7 @@ void Fingers::send(int finger, QEventPoint::State state)
     QList<QWindowSystemInterface::TouchPoint> points;
     for (auto it = m_down.cbegin(); it != m_down.cend(); ++it) {
         QWindowSystemInterface::TouchPoint point;
-        point.id = it.key();
+        point.id = it->id;
         point.state = it.key() == finger ? state : QEventPoint::State::Stationary;
         point.area = QRectF(it->position - QPointF(4, 4), QSizeF(8, 8));
         point.pressure = state == QEventPoint::State::Released && it.key() == finger ? 0 : 1;
@@ -97,5 +104,5 @@ void Fingers::send(int finger, QEventPoint::State state)
     }
     m_time += STEP;
     QWindowSystemInterface::handleTouchEvent<QWindowSystemInterface::SynchronousDelivery>(
-        m_down.value(finger).window, m_time, m_device.get(), points, Qt::NoModifier);
+        m_down.value(finger).window, m_time, m_devices.back().get(), points, Qt::NoModifier);
 }

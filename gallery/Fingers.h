@@ -8,6 +8,7 @@
 #include <QWindow>
 
 #include <memory>
+#include <vector>
 
 class QPointingDevice;
 class QWidget;
@@ -38,13 +39,17 @@ public:
 
 private:
     struct Finger {
+        int id = 0; // a new one for each press, as touch screens give
         QPoint position;
         QPointer<QWindow> window;
     };
 
+    void plugIn();
     void send(int finger, QEventPoint::State state);
 
-    std::unique_ptr<QPointingDevice> m_device;
+    // The last one is in use. Earlier ones stay: events and widgets may know them.
+    std::vector<std::unique_ptr<QPointingDevice>> m_devices;
     QMap<int, Finger> m_down;
+    int m_nextId = 1;
     unsigned long m_time = 0;
 };

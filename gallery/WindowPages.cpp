@@ -44,8 +44,8 @@ GalleryPage GalleryPages::tabs()
     GalleryPage page(QStringLiteral("tabs"), QSize(1280, 720));
     KSTabWidget* north = tabWidget(page, QRect(20, 20, 600, 300), QTabWidget::North);
     KSTabWidget* south = tabWidget(page, QRect(660, 20, 600, 300), QTabWidget::South);
-    KSTabWidget* west = tabWidget(page, QRect(20, 350, 600, 350), QTabWidget::West);
-    KSTabWidget* east = tabWidget(page, QRect(660, 350, 600, 350), QTabWidget::East);
+    KSTabWidget* west = tabWidget(page, QRect(20, 330, 600, 380), QTabWidget::West);
+    KSTabWidget* east = tabWidget(page, QRect(660, 330, 600, 380), QTabWidget::East);
     south->setTabIcon(0, QIcon(QStringLiteral(":/FolderPicker/Titler_folder_icon")));
     north->ksTabBar()->setTabSizeHint(1, QSize(220, 52));
     page.pose = [north, west, east](Fingers& fingers) {
@@ -66,10 +66,8 @@ GalleryPage GalleryPages::toolsBar()
     empty->slotDisableNewTextButton(true);
     page.pose = [full](Fingers& fingers) {
         full->findChild<KSPushbutton*>(QStringLiteral("SafeArea"))->click();
-        auto* canvas = full->findChild<KSPushbutton*>(QStringLiteral("Canvas"));
-        fingers.pressWidget(0, canvas, QPoint(60, 30));
-        fingers.lift(0);
-        fingers.pressWidget(1, full->findChild<KSPushbutton*>(QStringLiteral("Folder")), QPoint(60, 30));
+        fingers.pressWidget(0, full->findChild<KSPushbutton*>(QStringLiteral("Folder")), QPoint(60, 30));
+        full->findChild<KSPushbutton*>(QStringLiteral("Canvas"))->click();
     };
     return page;
 }

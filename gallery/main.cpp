@@ -6,40 +6,25 @@
 //   gallery --digest DIR         writes the digests that pictures are compared with
 //   gallery --monkey SEED COUNT  plays COUNT random steps over all pages; ends 1 when something is left
 //   pressed
+#include "app/APPEventFilter.h"
 #include "gallery/GalleryPages.h"
+#include "gallery/GalleryScreen.h"
 #include "gallery/Monkey.h"
 #include "gallery/PagePicture.h"
-#include "touchui/KSAppEventFilter.h"
 
 #include <QApplication>
 #include <QDir>
 #include <QFile>
 #include <QStringList>
-#include <QTemporaryFile>
 
 #include <cstdio>
+#include <memory>
 #include <vector>
 
 namespace
 {
 
 const char USAGE[] = "usage: gallery [--shoot DIR | --digest DIR | --monkey SEED COUNT] [PAGE...]\n";
-
-// Pictures and games take place on a screen of their own, the same on every machine.
-void useOwnScreen(QTemporaryFile& file)
-{
-    if (qEnvironmentVariableIsSet("GALLERY_PLATFORM")) {
-        qputenv("QT_QPA_PLATFORM", qgetenv("GALLERY_PLATFORM"));
-        return;
-    }
-    if (!file.open()) {
-        return;
-    }
-    file.write(R"({"screens":[{"name":"gallery","x":0,"y":0,"width":1920,"height":1080,)"
-               R"("logicalDpi":96,"logicalBaseDpi":96,"dpr":1}]})");
-    file.flush();
-    qputenv("QT_QPA_PLATFORM", "offscreen:configfile=" + QFile::encodeName(file.fileName()));
-}
 
 QList<GalleryPages::Maker> chosen(const QStringList& names)
 {
@@ -62,12 +47,7 @@ int shoot(const QDir& folder, bool digests, const QStringList& names)
     }
     for (const GalleryPages::Maker& maker : chosen(names)) {
         GalleryPage page = maker();
-        Fingers fingers;
-        page.show();
-        QCoreApplication::processEvents();
-        page.pose(fingers);
-        QCoreApplication::processEvents();
-        const QImage picture = PagePicture::shoot(page.window.get());
+        const QImage picture = page.shoot();
         if (digests) {
             QFile file(folder.filePath(page.name + QStringLiteral(".txt")));
             if (!file.open(QIODevice::WriteOnly)) {
@@ -77,7 +57,6 @@ int shoot(const QDir& folder, bool digests, const QStringList& names)
         } else if (!picture.save(folder.filePath(page.name + QStringLiteral(".png")))) {
             return 1;
         }
-        fingers.cancel();
         page.close();
     }
     return 0;
@@ -85,10 +64,7 @@ int shoot(const QDir& folder, bool digests, const QStringList& names)
 
 int playMonkey(quint32 seed, int count, const QStringList& names)
 {
-    KSAppEventFilter filter;
-    filter.setObjectName(QStringLiteral("gallery"));
-    filter.registerLockObject(&filter, nullptr, LOCKOBJECT_DEFAULTMUTEX, nullptr);
-    QCoreApplication::instance()->installEventFilter(&filter);
+    APPEventFilter* filter = APPEventFilter::instance();
     const QList<GalleryPages::Maker> pages = chosen(names);
     if (pages.isEmpty()) {
         return 2;
@@ -99,17 +75,19 @@ int playMonkey(quint32 seed, int count, const QStringList& names)
         GalleryPage page = pages.at(i)();
         const int steps =
             count / static_cast<int>(pages.size()) + (i < count % static_cast<int>(pages.size()) ? 1 : 0);
-        std::fprintf(stderr, "%s: seed %u, %d steps\n", qPrintable(page.name), seed, steps);
         page.show();
         QCoreApplication::processEvents();
         {
-            Monkey monkey(&filter, seed);
-            for (const QString& problem : monkey.play(page, steps)) {
+            Monkey monkey(filter, seed);
+            const QStringList problems = monkey.play(page, steps);
+            std::fprintf(stderr, "%s: seed %u, %d steps, input %08x\n", qPrintable(page.name), seed, steps,
+                         monkey.inputChecksum());
+            for (const QString& problem : problems) {
                 ++failures;
                 std::fprintf(stderr, "  %s\n", qPrintable(problem));
             }
         }
-        filter.unlock();
+        filter->unlock();
         page.close();
     }
     return failures == 0 ? 0 : 1;
@@ -117,9 +95,7 @@ int playMonkey(quint32 seed, int count, const QStringList& names)
 
 int showPages(const QStringList& names)
 {
-    KSAppEventFilter filter;
-    filter.registerLockObject(&filter, nullptr, LOCKOBJECT_DEFAULTMUTEX, nullptr);
-    QCoreApplication::instance()->installEventFilter(&filter);
+    APPEventFilter::instance();
     std::vector<GalleryPage> pages;
     for (const GalleryPages::Maker& maker : chosen(names)) {
         pages.push_back(maker());
@@ -154,9 +130,9 @@ int main(int argc, char* argv[])
     if (qEnvironmentVariableIsEmpty("FONTCONFIG_FILE")) {
         qputenv("FONTCONFIG_FILE", TITLER_FONTS_CONF);
     }
-    QTemporaryFile screen;
+    std::unique_ptr<GalleryScreen> screen;
     if (monkey || pictures) {
-        useOwnScreen(screen);
+        screen = std::make_unique<GalleryScreen>();
     }
     QApplication application(argc, argv);
     Q_INIT_RESOURCE(TitlerToolResource);

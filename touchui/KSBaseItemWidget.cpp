@@ -150,6 +150,8 @@ void KSBaseItemWidget::setPopup(bool popup)
 {
     m_shadow->setEnabled(popup);
     m_popup = popup;
+    // Its ground would show on the lifted look, which paints the handle itself.
+    m_handle->setVisible(m_dragFlag && !popup);
     updateDragArea();
     update();
 }
@@ -168,7 +170,7 @@ void KSBaseItemWidget::setDragFlag(bool dragFlag)
     updateDragArea();
     if (dragFlag) {
         m_handle->setGeometry(QRect(getHandlePos(), QSize(HANDLE_SIZE, HANDLE_SIZE)));
-        m_handle->show();
+        m_handle->setVisible(!m_popup);
         m_handle->raise();
     } else {
         m_handle->hide();

@@ -90,6 +90,7 @@ private Q_SLOTS:
     void disabledWidgetIsShut();
     void gestureIsSwallowed();
     void cancelFreesTheLock();
+    void anIgnoredTouchFreesTheLock();
     void forcedLockBreaksTheTouch();
     void registeredFiltersHearInOrder();
     void deletedFilterLeaves();
@@ -374,6 +375,31 @@ void TestEventLocks::cancelFreesTheLock()
     QCoreApplication::sendEvent(m_first, &cancel);
     QVERIFY(!m_filter->isLock(nullptr, LOCKMETHOD_TOUCH));
     lift(m_first, 0);
+}
+
+// A widget that takes touches and does nothing with them, as a window beside its buttons.
+void TestEventLocks::anIgnoredTouchFreesTheLock()
+{
+    QWidget ground;
+    ground.setAttribute(Qt::WA_AcceptTouchEvents);
+    ground.setGeometry(600, 400, 100, 100);
+    ground.show();
+    QVERIFY(QTest::qWaitForWindowExposed(&ground));
+    QSignalSpy clicked(m_first, &QAbstractButton::clicked);
+    QTest::touchEvent(&ground, m_device).press(0, QPoint(50, 50));
+    QVERIFY(m_filter->isLock(nullptr, LOCKMETHOD_TOUCH));
+    QTest::touchEvent(&ground, m_device).press(1, QPoint(20, 20)).stationary(0);
+    QTest::touchEvent(&ground, m_device).release(0, QPoint(50, 50)).stationary(1);
+    QTest::touchEvent(&ground, m_device).release(1, QPoint(20, 20));
+    QTRY_VERIFY_WITH_TIMEOUT(!m_filter->isLock(nullptr, LOCKMETHOD_TOUCH), 1000);
+    touch(m_first, 0);
+    QCoreApplication::processEvents();
+    QVERIFY(m_filter->isLock(nullptr, LOCKMETHOD_TOUCH));
+    QTest::touchEvent(m_first, m_device).move(0, QPoint(12, 12));
+    QCoreApplication::processEvents();
+    QVERIFY(m_filter->isLock(nullptr, LOCKMETHOD_TOUCH));
+    lift(m_first, 0);
+    QCOMPARE(clicked.count(), 1);
 }
 
 void TestEventLocks::forcedLockBreaksTheTouch()
