@@ -99,9 +99,12 @@ void ToolsBar::createButtons()
 void ToolsBar::createMenu()
 {
     m_menu = new QMenu(this);
-    m_menu->setWindowFlag(Qt::FramelessWindowHint);
-    m_menu->setWindowFlag(Qt::NoDropShadowWindowHint);
+    // No popup: while one is open Qt delivers no touches, and the finger that opened it by sliding off its
+    // button would never be lifted.
+    m_menu->setWindowFlags(Qt::ToolTip | Qt::FramelessWindowHint | Qt::NoDropShadowWindowHint |
+                           Qt::WindowDoesNotAcceptFocus);
     m_menu->setAttribute(Qt::WA_TranslucentBackground);
+    m_menu->setAttribute(Qt::WA_ShowWithoutActivating);
     for (int i = 0; i < MENU_ITEMS; ++i) {
         m_menu->addAction(QString())->setData(i);
     }
@@ -439,28 +442,33 @@ bool ToolsBar::eventFilter(QObject* obj, QEvent* event)
     if (obj == m_menu) {
         return paintCanvasMenu(event);
     }
-    return closeMenuByTouch(obj, event);
+    return closeMenuByPress(obj, event);
 }
 
-bool ToolsBar::closeMenuByTouch(QObject* obj, QEvent* event)
+bool ToolsBar::closeMenuByPress(QObject* obj, QEvent* event)
 {
     switch (event->type()) {
-    case QEvent::TouchBegin: {
-        m_closingTouch.clear();
-        const auto* touch = static_cast<QTouchEvent*>(event);
-        if (!m_menu->isVisible() || touch->points().isEmpty() ||
-            m_menu->geometry().contains(touch->points().constFirst().globalPosition().toPoint())) {
+    case QEvent::TouchBegin:
+    case QEvent::MouseButtonPress:
+    case QEvent::MouseButtonDblClick: {
+        m_closingPress.clear();
+        const auto* press = static_cast<QPointerEvent*>(event);
+        if (!m_menu->isVisible() || !obj->isWidgetType() || press->points().isEmpty() ||
+            m_menu->geometry().contains(press->points().constFirst().globalPosition().toPoint())) {
             return false;
         }
         m_menu->hide();
-        m_closingTouch = obj;
+        m_closingPress = obj;
         return true;
     }
     case QEvent::TouchUpdate:
-        return m_closingTouch != nullptr && m_closingTouch == obj;
+    case QEvent::MouseMove:
+        return m_closingPress != nullptr && m_closingPress == obj;
     case QEvent::TouchEnd:
-        if (m_closingTouch != nullptr && m_closingTouch == obj) {
-            m_closingTouch.clear();
+    case QEvent::TouchCancel:
+    case QEvent::MouseButtonRelease:
+        if (m_closingPress != nullptr && m_closingPress == obj) {
+            m_closingPress.clear();
             return true;
         }
         return false;
@@ -502,14 +510,7 @@ bool ToolsBar::paintCanvasMenu(QEvent* event)
 
 void ToolsBar::onMouseButtonPress(QMouseEvent* event)
 {
-    const QPoint point = event->position().toPoint();
-    if (!m_menu->rect().contains(point)) {
-        // The press that closes the menu does nothing else.
-        m_menu->setAttribute(Qt::WA_NoMouseReplay);
-        m_menu->hide();
-        return;
-    }
-    m_menuItem = cursorItem(point);
+    m_menuItem = cursorItem(event->position().toPoint());
     m_menu->update();
 }
 

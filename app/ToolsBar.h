@@ -124,7 +124,7 @@ private:
     void drawMenuItem(QPainter* painter);
     static QRect getMenuItemRect(const QRect& rect, int index);
     int cursorItem(const QPoint& point) const;
-    bool closeMenuByTouch(QObject* obj, QEvent* event);
+    bool closeMenuByPress(QObject* obj, QEvent* event);
 
     QAction* m_undoAction;
     QAction* m_redoAction;
@@ -140,5 +140,5 @@ private:
     QPixmap m_menuBackground;
     int m_menuItem = -1; // under the finger
     bool m_safeAreaShown = false;
-    QPointer<QObject> m_closingTouch; // took the touch that closed the menu
+    QPointer<QObject> m_closingPress; // took the touch or press that closed the menu
 };

@@ -1,10 +1,13 @@
 #include "gallery/GalleryPage.h"
 
+#include "app/APPEventFilter.h"
+#include "gallery/PagePicture.h"
 #include "touchui/Balloon.h"
 #include "touchui/KSMenu.h"
 #include "touchui/KSScrollViewerWidget.h"
 #include "touchui/KSToolTip.h"
 
+#include <QCoreApplication>
 #include <QLabel>
 
 GalleryPage::GalleryPage(const QString& pageName, const QSize& size)
@@ -25,6 +28,19 @@ void GalleryPage::show()
     Balloon::s_ParentWindow = window.get();
     window->move(0, 0);
     window->show();
+}
+
+QImage GalleryPage::shoot()
+{
+    APPEventFilter::release(); // a pose has several fingers, on several widgets
+    Fingers fingers;
+    show();
+    QCoreApplication::processEvents();
+    pose(fingers);
+    QCoreApplication::processEvents();
+    const QImage picture = PagePicture::shoot(window.get());
+    fingers.cancel();
+    return picture;
 }
 
 void GalleryPage::close()

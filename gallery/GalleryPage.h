@@ -2,6 +2,7 @@
 
 #include "gallery/Fingers.h"
 
+#include <QImage>
 #include <QSize>
 #include <QString>
 #include <QWidget>
@@ -19,6 +20,8 @@ struct GalleryPage {
     // Shows the window at the screen's corner and makes it the one that bounds menus, balloons and lifted
     // items.
     void show();
+    // The page in its pose, with what it has opened; the fingers are taken away again.
+    QImage shoot();
     // Brings the window down and closes what it opened.
     void close();
 

@@ -21,7 +21,9 @@ namespace
 {
 
 constexpr int MOST_FINGERS = 3;
-constexpr int REACH = 140;            // how far a finger goes in one step
+constexpr int REACH = 140; // how far a finger goes in one step
+constexpr int SMALL_REACH = 8;
+constexpr int WHEEL_STEP = 120;
 constexpr int MARGIN = 30;            // how far beside a window a finger may be
 constexpr qint64 SETTLE_TIME = 15000; // a flick may run that long, in milliseconds
 constexpr int STEPS_PER_REST = 500;   // now and then everything comes to rest
@@ -55,6 +57,12 @@ Monkey::Monkey(KSAppEventFilter* filter, quint32 seed) : m_filter(filter), m_ran
 
 QStringList Monkey::play(GalleryPage& page, int steps)
 {
+    m_targets.clear();
+    for (const QWidget* child : page.window->findChildren<QWidget*>()) {
+        if (child->isVisibleTo(page.window.get()) && !child->isWindow() && !child->size().isEmpty()) {
+            m_targets.append(QRect(child->mapTo(page.window.get(), QPoint(0, 0)), child->size()));
+        }
+    }
     for (int i = 1; i <= steps; ++i) {
         step(page);
         QCoreApplication::processEvents();
@@ -76,7 +84,7 @@ QStringList Monkey::play(GalleryPage& page, int steps)
     return problems;
 }
 
-void Monkey::step(GalleryPage& page)
+void Monkey::step(const GalleryPage& page)
 {
     const int dice = number(100);
     if (m_fingers.count() == 0) {
@@ -90,17 +98,14 @@ void Monkey::step(GalleryPage& page)
     } else if (dice < 70) {
         press(page); // a second finger
     } else if (dice < 97) {
-        int finger = number(MOST_FINGERS);
-        for (int i = 0; i < MOST_FINGERS && !m_fingers.isDown(finger); ++i) {
-            finger = (finger + 1) % MOST_FINGERS;
-        }
-        m_fingers.lift(finger);
+        lift();
     } else {
+        note(6, 0, QPoint());
         m_fingers.cancel();
     }
 }
 
-// In an order that is the same in each run.
+// Those that the page has opened, the last one on top.
 QList<QWidget*> Monkey::windows(const GalleryPage& page) const
 {
     QList<QWidget*> result;
@@ -113,77 +118,95 @@ QList<QWidget*> Monkey::windows(const GalleryPage& page) const
     std::sort(result.begin(), result.end(), [](const QWidget* a, const QWidget* b) {
         return std::make_tuple(a->x(), a->y(), a->width()) < std::make_tuple(b->x(), b->y(), b->width());
     });
-    result.prepend(page.window.get());
     return result;
 }
 
-QPoint Monkey::anyPoint(QWidget* window)
+// Chosen without regard to what the page has come to, so that a seed gives the same input each time.
+QPoint Monkey::anyPoint(const GalleryPage& page)
 {
-    const QPoint place(number(window->width() + 2 * MARGIN) - MARGIN,
-                       number(window->height() + 2 * MARGIN) - MARGIN);
-    return window->mapToGlobal(place);
+    // More often on something than beside everything.
+    const QRect area = number(4) != 0 && !m_targets.isEmpty()
+                           ? m_targets.at(number(static_cast<int>(m_targets.size())))
+                           : page.window->rect().adjusted(-MARGIN, -MARGIN, MARGIN, MARGIN);
+    return page.window->mapToGlobal(area.topLeft() + QPoint(number(area.width()), number(area.height())));
 }
 
-void Monkey::press(GalleryPage& page)
+// The window that lies on top there.
+QWidget* Monkey::windowAt(const GalleryPage& page, const QPoint& place) const
 {
-    const QList<QWidget*> list = windows(page);
-    QWidget* window = list.at(number(static_cast<int>(list.size())));
-    const int finger = number(MOST_FINGERS);
-    // More often on something than beside everything.
-    const QList<QWidget*> children = window->findChildren<QWidget*>();
-    QPoint place = anyPoint(window);
-    if (!children.isEmpty() && number(4) != 0) {
-        const QWidget* child = children.at(number(static_cast<int>(children.size())));
-        if (child->isVisible() && child->window() == window && !child->size().isEmpty()) {
-            place = child->mapToGlobal(QPoint(number(child->width()), number(child->height())));
-        }
-    }
-    // A finger presses the window that lies on top there.
-    for (QWidget* other : list) {
-        if (other != page.window.get() && other->geometry().contains(place)) {
+    QWidget* window = page.window.get();
+    for (QWidget* other : windows(page)) {
+        if (other->geometry().contains(place)) {
             window = other;
         }
     }
-    m_fingers.press(finger, window, place);
+    return window;
+}
+
+void Monkey::press(const GalleryPage& page)
+{
+    const int finger = number(MOST_FINGERS);
+    const QPoint place = anyPoint(page);
+    note(1, finger, place);
+    m_fingers.press(finger, windowAt(page, place), place);
 }
 
 void Monkey::move()
 {
     for (int finger = 0; finger < MOST_FINGERS; ++finger) {
         if (m_fingers.isDown(finger) && number(2) == 0) {
-            const bool small = number(3) == 0;
-            const int reach = small ? 8 : REACH;
-            m_fingers.move(finger, m_fingers.position(finger) +
-                                       QPoint(number(2 * reach + 1) - reach, number(2 * reach + 1) - reach));
+            const int reach = number(3) == 0 ? SMALL_REACH : REACH;
+            const QPoint place = m_fingers.position(finger) +
+                                 QPoint(number(2 * reach + 1) - reach, number(2 * reach + 1) - reach);
+            note(2, finger, place);
+            m_fingers.move(finger, place);
         }
     }
 }
 
-// A click or a drag with the mouse, or its wheel.
-void Monkey::mouse(GalleryPage& page)
+void Monkey::lift()
 {
-    const QList<QWidget*> list = windows(page);
-    QWidget* window = list.at(number(static_cast<int>(list.size())));
-    QWindow* handle = window->windowHandle();
-    QPoint place = anyPoint(window);
-    const auto send = [window, handle](const QPoint& position, Qt::MouseButtons buttons,
-                                       Qt::MouseButton button, QEvent::Type type) {
-        QWindowSystemInterface::handleMouseEvent<QWindowSystemInterface::SynchronousDelivery>(
-            handle, window->mapFromGlobal(position), position, buttons, button, type);
+    int finger = number(MOST_FINGERS);
+    for (int i = 0; i < MOST_FINGERS && !m_fingers.isDown(finger); ++i) {
+        finger = (finger + 1) % MOST_FINGERS;
+    }
+    note(3, finger, QPoint());
+    m_fingers.lift(finger);
+}
+
+// A click or a drag with the mouse, or its wheel.
+void Monkey::mouse(const GalleryPage& page)
+{
+    QPoint place = anyPoint(page);
+    const bool wheel = number(4) == 0;
+    const int turn = number(2) == 0 ? WHEEL_STEP : -WHEEL_STEP;
+    const int moves = number(4);
+    QWidget* window = windowAt(page, place);
+    const QPointer<QWindow> handle = window->windowHandle();
+    note(wheel ? 4 : 5, turn, place);
+    const auto send = [&](Qt::MouseButtons buttons, Qt::MouseButton button, QEvent::Type type) {
+        if (handle) {
+            QWindowSystemInterface::handleMouseEvent<QWindowSystemInterface::SynchronousDelivery>(
+                handle, handle->mapFromGlobal(place), place, buttons, button, type);
+        }
     };
-    if (number(4) == 0) {
-        QWindowSystemInterface::handleWheelEvent(
-            handle, window->mapFromGlobal(place), place, QPoint(), QPoint(0, number(2) == 0 ? 120 : -120));
+    if (wheel) {
+        QWindowSystemInterface::handleWheelEvent(handle, handle->mapFromGlobal(place), place, QPoint(),
+                                                 QPoint(0, turn));
         return;
     }
-    QPointer<QWindow> alive(handle);
-    send(place, Qt::LeftButton, Qt::LeftButton, QEvent::MouseButtonPress);
-    for (int moves = number(4); moves > 0 && alive; --moves) {
+    send(Qt::LeftButton, Qt::LeftButton, QEvent::MouseButtonPress);
+    for (int i = 0; i < moves; ++i) {
         place += QPoint(number(81) - 40, number(81) - 40);
-        send(place, Qt::LeftButton, Qt::NoButton, QEvent::MouseMove);
+        send(Qt::LeftButton, Qt::NoButton, QEvent::MouseMove);
     }
-    if (alive) {
-        send(place, Qt::NoButton, Qt::LeftButton, QEvent::MouseButtonRelease);
+    send(Qt::NoButton, Qt::LeftButton, QEvent::MouseButtonRelease);
+}
+
+void Monkey::note(int action, int finger, const QPoint& place)
+{
+    for (const int value : {action, finger, place.x(), place.y()}) {
+        m_input = (m_input ^ static_cast<quint32>(value)) * 16777619U;
     }
 }
 

@@ -85,12 +85,9 @@ GalleryPage GalleryPages::comboBoxes()
         comboBox(page, QRect(700, 180, 214, 48), {QStringLiteral("64"), QStringLiteral("66")});
     editable->setEditable(true);
     comboBox(page, QRect(700, 250, 214, 48), {});
-    page.caption(QPoint(700, 322), QStringLiteral("held"));
-    KSCombobox* held = comboBox(page, QRect(700, 350, 214, 48), {QStringLiteral("KST Medium")});
-    held->setPopupEnable(false);
-    page.pose = [open, byText, colors, held](Fingers& fingers) {
+    page.pose = [open, byText, colors](Fingers& fingers) {
         open->showPopup();
-        fingers.pressWidget(1, open->listView()->viewport(), QPoint(40, 56 * 4 + 20));
+        fingers.pressWidget(0, open->listView()->viewport(), QPoint(40, 56 * 4 + 20));
         byText->showPopup();
         colors->showPopup();
     };

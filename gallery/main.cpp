@@ -8,6 +8,7 @@
 //   pressed
 #include "app/APPEventFilter.h"
 #include "gallery/GalleryPages.h"
+#include "gallery/GalleryScreen.h"
 #include "gallery/Monkey.h"
 #include "gallery/PagePicture.h"
 
@@ -15,31 +16,15 @@
 #include <QDir>
 #include <QFile>
 #include <QStringList>
-#include <QTemporaryFile>
 
 #include <cstdio>
+#include <memory>
 #include <vector>
 
 namespace
 {
 
 const char USAGE[] = "usage: gallery [--shoot DIR | --digest DIR | --monkey SEED COUNT] [PAGE...]\n";
-
-// Pictures and games take place on a screen of their own, the same on every machine.
-void useOwnScreen(QTemporaryFile& file)
-{
-    if (qEnvironmentVariableIsSet("GALLERY_PLATFORM")) {
-        qputenv("QT_QPA_PLATFORM", qgetenv("GALLERY_PLATFORM"));
-        return;
-    }
-    if (!file.open()) {
-        return;
-    }
-    file.write(R"({"screens":[{"name":"gallery","x":0,"y":0,"width":1920,"height":1080,)"
-               R"("logicalDpi":96,"logicalBaseDpi":96,"dpr":1}]})");
-    file.flush();
-    qputenv("QT_QPA_PLATFORM", "offscreen:configfile=" + QFile::encodeName(file.fileName()));
-}
 
 QList<GalleryPages::Maker> chosen(const QStringList& names)
 {
@@ -62,12 +47,7 @@ int shoot(const QDir& folder, bool digests, const QStringList& names)
     }
     for (const GalleryPages::Maker& maker : chosen(names)) {
         GalleryPage page = maker();
-        Fingers fingers;
-        page.show();
-        QCoreApplication::processEvents();
-        page.pose(fingers);
-        QCoreApplication::processEvents();
-        const QImage picture = PagePicture::shoot(page.window.get());
+        const QImage picture = page.shoot();
         if (digests) {
             QFile file(folder.filePath(page.name + QStringLiteral(".txt")));
             if (!file.open(QIODevice::WriteOnly)) {
@@ -77,7 +57,6 @@ int shoot(const QDir& folder, bool digests, const QStringList& names)
         } else if (!picture.save(folder.filePath(page.name + QStringLiteral(".png")))) {
             return 1;
         }
-        fingers.cancel();
         page.close();
     }
     return 0;
@@ -96,12 +75,14 @@ int playMonkey(quint32 seed, int count, const QStringList& names)
         GalleryPage page = pages.at(i)();
         const int steps =
             count / static_cast<int>(pages.size()) + (i < count % static_cast<int>(pages.size()) ? 1 : 0);
-        std::fprintf(stderr, "%s: seed %u, %d steps\n", qPrintable(page.name), seed, steps);
         page.show();
         QCoreApplication::processEvents();
         {
             Monkey monkey(filter, seed);
-            for (const QString& problem : monkey.play(page, steps)) {
+            const QStringList problems = monkey.play(page, steps);
+            std::fprintf(stderr, "%s: seed %u, %d steps, input %08x\n", qPrintable(page.name), seed, steps,
+                         monkey.inputChecksum());
+            for (const QString& problem : problems) {
                 ++failures;
                 std::fprintf(stderr, "  %s\n", qPrintable(problem));
             }
@@ -149,9 +130,9 @@ int main(int argc, char* argv[])
     if (qEnvironmentVariableIsEmpty("FONTCONFIG_FILE")) {
         qputenv("FONTCONFIG_FILE", TITLER_FONTS_CONF);
     }
-    QTemporaryFile screen;
+    std::unique_ptr<GalleryScreen> screen;
     if (monkey || pictures) {
-        useOwnScreen(screen);
+        screen = std::make_unique<GalleryScreen>();
     }
     QApplication application(argc, argv);
     Q_INIT_RESOURCE(TitlerToolResource);

@@ -81,12 +81,19 @@ bool KSAppEventFilter::doEventFilter(QObject* obj, QEvent* event)
     case QEvent::TouchUpdate:
     case QEvent::TouchEnd:
         if (obj->isWindowType()) {
+            watchIgnoredTouch(event);
             return false;
         }
+        noticeAcceptedTouch(obj);
         return !isEnable(obj) || doLock(obj, event) != 0;
     case QEvent::TouchCancel:
+        if (obj->isWindowType()) {
+            watchIgnoredTouch(event);
+            return false;
+        }
         // The end of a touch that no end will follow.
-        if (!obj->isWindowType() && isLock(obj, LOCKMETHOD_TOUCH)) {
+        noticeAcceptedTouch(obj);
+        if (isLock(obj, LOCKMETHOD_TOUCH)) {
             tryUnlock(obj, LOCKMETHOD_TOUCH);
         }
         return false;
@@ -156,11 +163,46 @@ int KSAppEventFilter::doLockTouchBegin(QObject* obj, QEvent* event)
             }
         }
     }
+    if (result == 0 && pointCount(event) > 0) {
+        m_begun = obj;
+        m_begunId = static_cast<const QTouchEvent*>(event)->points().constFirst().id();
+    }
     logTouch(QStringLiteral("Name = %1 :TouchBegin %2; rs = %3 ;PointCount = %4")
                  .arg(objectName(), describe(obj))
                  .arg(result)
                  .arg(pointCount(event)));
     return result;
+}
+
+// A widget that was let through but ignored the begin, such as a window beside its buttons, sees neither
+// updates nor the end. When its finger is lifted from the window, it lets go.
+void KSAppEventFilter::watchIgnoredTouch(QEvent* event)
+{
+    if (m_begun == nullptr) {
+        return;
+    }
+    bool lifted = event->type() == QEvent::TouchCancel;
+    for (const QEventPoint& point : static_cast<QTouchEvent*>(event)->points()) {
+        lifted = lifted || (point.id() == m_begunId && point.state() == QEventPoint::State::Released);
+    }
+    if (!lifted) {
+        return;
+    }
+    // After the widgets have had this event, by which one of them may prove that it accepted the begin.
+    const auto release = [this, obj = m_begun, id = m_begunId] {
+        if (obj != nullptr && obj == m_begun && id == m_begunId) {
+            m_begun.clear();
+            tryUnlock(obj, LOCKMETHOD_TOUCH);
+        }
+    };
+    QMetaObject::invokeMethod(this, release, Qt::QueuedConnection);
+}
+
+void KSAppEventFilter::noticeAcceptedTouch(const QObject* obj)
+{
+    if (obj == m_begun) {
+        m_begun.clear();
+    }
 }
 
 int KSAppEventFilter::doLockTouchUpdate(QObject* obj, QEvent* event)

@@ -5,6 +5,7 @@
 #include <QList>
 #include <QMap>
 #include <QObject>
+#include <QPointer>
 
 // The application-wide gate that decides which object may receive a touch: it is installed on the application
 // object and sees every event first. One object at a time holds the default lock; a touch on any other is
@@ -92,9 +93,13 @@ Q_SIGNALS:
 
 private:
     static int priorityOf(LOCKOBJECT_TYPE type);
+    void watchIgnoredTouch(QEvent* event);
+    void noticeAcceptedTouch(const QObject* obj);
 
     QMap<int, QList<KSLockObject*>> m_registered; // by priority; 6 is asked first
     QMap<KSLockObject*, QList<QObject*>> m_active;
     QList<KSLockObject*> m_owned;
     QList<QObject*> m_eventFilters;
+    QPointer<QObject> m_begun; // was let through last, and has not seen more of its touch
+    int m_begunId = -1;
 };

@@ -157,6 +157,8 @@ void KSBaseItemWidget::setPopup(bool popup)
 {
     m_shadow->setEnabled(popup);
     m_popup = popup;
+    // Its ground would show on the lifted look, which paints the handle itself.
+    m_handle->setVisible(m_dragFlag && !popup);
     updateDragArea();
     update();
 }
@@ -177,7 +179,7 @@ void KSBaseItemWidget::setDragFlag(bool dragFlag)
         if (!m_handle)
             m_handle = makeHandle();
         m_handle->setGeometry(QRect(getHandlePos(), QSize(HANDLE_SIZE, HANDLE_SIZE)));
-        m_handle->show();
+        m_handle->setVisible(!m_popup);
         m_handle->raise();
     } else if (m_handle) {
         m_handle->hide();

@@ -64,6 +64,14 @@ KSCombobox::KSCombobox(QWidget* parent)
     QFont textFont = font();
     textFont.setPixelSize(TEXT_PIXELS);
     setFont(textFont);
+    // An editable box's field shows the pictures behind it.
+    QPalette colors = palette();
+    colors.setColor(QPalette::Base, Qt::transparent);
+    for (const QPalette::ColorGroup group : {QPalette::Active, QPalette::Inactive}) {
+        colors.setColor(group, QPalette::Text, TEXT_COLOR);
+    }
+    colors.setColor(QPalette::Disabled, QPalette::Text, DISABLED_COLOR);
+    setPalette(colors);
     setView(m_view);
     setItemDelegate(m_delegate);
     connect(m_view, &CustomComboBoxView::signalTapped, this, &KSCombobox::choose);

@@ -9,6 +9,7 @@ namespace
 {
 
 constexpr int SLICES_PER_STATE = 3;
+const QColor TEXT(220, 220, 220);
 const QColor DISABLED_TEXT(102, 102, 102);
 
 } // namespace
@@ -190,7 +191,10 @@ void KSPushbutton::drawText(QPainter& painter)
         return;
     }
     const bool disabled = m_paintedState == ButtonDisabled || m_paintedState == ButtonSelectedDisabled;
-    painter.setPen(disabled ? DISABLED_TEXT : palette().color(QPalette::Active, QPalette::ButtonText));
+    // Bright on the dark pictures, unless the owner chose another colour.
+    const bool chosen = palette().isBrushSet(QPalette::Active, QPalette::ButtonText);
+    const QColor ink = chosen ? palette().color(QPalette::Active, QPalette::ButtonText) : TEXT;
+    painter.setPen(disabled ? DISABLED_TEXT : ink);
     painter.setFont(font());
     const QRect area = rect().adjusted(m_textMargin, 0, -m_textMargin, 0);
     painter.drawText(area, static_cast<int>(m_textAlignment) | Qt::TextSingleLine, text());

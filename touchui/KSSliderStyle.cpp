@@ -14,6 +14,7 @@ constexpr int PLAIN_GROOVE = 12;
 constexpr int TICK_LENGTH = 8;
 constexpr int TICK_WIDTH = 2;
 constexpr int MOST_TICKS = 200; // more would be a grey bar
+constexpr qreal DISABLED_OPACITY = 0.4;
 const QColor PLAIN_COLOR(102, 102, 102);
 const QColor PLAIN_GROOVE_COLOR(30, 30, 30);
 const QColor TICK_COLOR(178, 178, 178);
@@ -109,9 +110,13 @@ void KSSliderStyle::drawHandle(const QStyleOptionSlider& option, QPainter& paint
     const QPixmap& picture = m_images.handle[look].isNull() ? m_images.handle[0] : m_images.handle[look];
     if (picture.isNull()) {
         painter.fillRect(target, PLAIN_COLOR);
-    } else {
-        painter.drawPixmap(target, picture);
+        return;
     }
+    // The pictures have no disabled look of their own.
+    painter.save();
+    painter.setOpacity(look == 2 ? DISABLED_OPACITY : 1.0);
+    painter.drawPixmap(target, picture);
+    painter.restore();
 }
 
 void KSSliderStyle::drawTick(const QStyleOptionSlider& option, QPainter& painter) const

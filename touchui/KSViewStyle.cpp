@@ -14,6 +14,7 @@ namespace
 
 constexpr int HEADER_ARROW_SIZE = 16;
 constexpr int OPERATION_BORDER = 2;
+constexpr qreal DISABLED_ICON_OPACITY = 0.4;
 const QColor PRESSED_HEADER(0, 129, 255, 70);
 
 QString indicatorPath(const char* family, bool enabled, bool pressed)
@@ -215,7 +216,11 @@ void KSViewStyle::drawViewItem(QPainter* painter, const QStyleOptionViewItem& op
         if (loading > 0) {
             drawCentered(painter, layout.icon, m_view->getLoadingImagePath(loading));
         } else {
+            const bool enabled = option.state & State_Enabled;
+            painter->save();
+            painter->setOpacity(enabled ? 1.0 : DISABLED_ICON_OPACITY);
             option.icon.paint(painter, layout.icon, Qt::AlignCenter);
+            painter->restore();
         }
     }
     if (!layout.mark.isNull()) {

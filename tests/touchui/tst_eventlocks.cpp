@@ -87,9 +87,13 @@ private Q_SLOTS:
     void secondButtonIsLockedOut();
     void sameWidgetTakesASecondFinger();
     void updateWithoutLockIsSwallowed();
+    void aStrangersEndIsSwallowed();
+    void aVanishedHolderIsCutOff();
+    void sixthObjectOfAClusterIsSwallowed();
     void disabledWidgetIsShut();
     void gestureIsSwallowed();
     void cancelFreesTheLock();
+    void anIgnoredTouchFreesTheLock();
     void forcedLockBreaksTheTouch();
     void registeredFiltersHearInOrder();
     void deletedFilterLeaves();
@@ -346,6 +350,74 @@ void TestEventLocks::updateWithoutLockIsSwallowed()
     QCOMPARE(m_filter->getLockMethod(const_cast<QEvent*>(&press)), LOCKMETHOD_MOUSE);
 }
 
+void TestEventLocks::aStrangersEndIsSwallowed()
+{
+    touch(m_first, 0);
+    QTouchEvent end(QEvent::TouchEnd, m_device, Qt::NoModifier,
+                    {QEventPoint(1, QEventPoint::Released, QPointF(30, 30), QPointF(30, 30))});
+    QVERIFY(m_filter->doEventFilter(m_second, &end));
+    QVERIFY(m_filter->isLock(nullptr, LOCKMETHOD_TOUCH));
+    QVERIFY(m_first->isDown());
+    lift(m_first, 0);
+    QVERIFY(!m_filter->isLock(nullptr, LOCKMETHOD_TOUCH));
+}
+
+void TestEventLocks::aVanishedHolderIsCutOff()
+{
+    auto* gone = new TouchEventButton;
+    gone->setGeometry(600, 400, 100, 100);
+    gone->show();
+    QVERIFY(QTest::qWaitForWindowExposed(gone));
+    QTest::touchEvent(gone, m_device).press(0, QPoint(20, 20));
+    QVERIFY(gone->isDown());
+    delete gone;
+    QSignalSpy clicked(m_second, &QAbstractButton::clicked);
+    touch(m_second, 1);
+    lift(m_second, 1);
+    QCOMPARE(clicked.count(), 0);
+    auto* lock = KSEventDefaultMutexLockObject::createFactory(m_filter.get(), nullptr);
+    QVERIFY(lock->isLocked());
+    lock->findChild<QTimer*>()->start(0);
+    QTRY_VERIFY(!lock->isLocked());
+    touch(m_second, 2);
+    lift(m_second, 2);
+    QCOMPARE(clicked.count(), 1);
+}
+
+void TestEventLocks::sixthObjectOfAClusterIsSwallowed()
+{
+    EventCounter objects[6];
+    QList<QObject*> all;
+    for (EventCounter& object : objects) {
+        all.append(&object);
+    }
+    KSLockObject* cluster = m_filter->registerLockObject(all, nullptr, LOCKOBJECT_CLUSTER, nullptr);
+    const auto send = [this](QObject* object, QEvent::Type type) {
+        QTouchEvent event(type, m_device);
+        return QCoreApplication::sendEvent(object, &event);
+    };
+    for (EventCounter& object : objects) {
+        send(&object, QEvent::TouchBegin);
+    }
+    QCOMPARE(m_filter->activateLockObjects().value(cluster).size(), 5);
+    QCOMPARE(objects[4].types, QList<int>{QEvent::TouchBegin});
+    QVERIFY(objects[5].types.isEmpty());
+    send(&objects[5], QEvent::TouchUpdate);
+    send(&objects[5], QEvent::TouchEnd);
+    QVERIFY(objects[5].types.isEmpty());
+    // The finger that lifts frees a place.
+    send(&objects[0], QEvent::TouchEnd);
+    QCOMPARE(objects[0].types.constLast(), int(QEvent::TouchEnd));
+    send(&objects[5], QEvent::TouchBegin);
+    QCOMPARE(objects[5].types, QList<int>{QEvent::TouchBegin});
+    for (int i = 1; i < 6; ++i) {
+        QVERIFY(m_filter->isLock(nullptr, LOCKMETHOD_TOUCH));
+        send(&objects[i], QEvent::TouchEnd);
+    }
+    QVERIFY(!m_filter->isLock(nullptr, LOCKMETHOD_TOUCH));
+    m_filter->removeRegLockObject(cluster);
+}
+
 void TestEventLocks::disabledWidgetIsShut()
 {
     QSignalSpy begun(m_filter.get(), &KSAppEventFilter::signalEventBegin);
@@ -374,6 +446,31 @@ void TestEventLocks::cancelFreesTheLock()
     QCoreApplication::sendEvent(m_first, &cancel);
     QVERIFY(!m_filter->isLock(nullptr, LOCKMETHOD_TOUCH));
     lift(m_first, 0);
+}
+
+// A widget that takes touches and does nothing with them, as a window beside its buttons.
+void TestEventLocks::anIgnoredTouchFreesTheLock()
+{
+    QWidget ground;
+    ground.setAttribute(Qt::WA_AcceptTouchEvents);
+    ground.setGeometry(600, 400, 100, 100);
+    ground.show();
+    QVERIFY(QTest::qWaitForWindowExposed(&ground));
+    QSignalSpy clicked(m_first, &QAbstractButton::clicked);
+    QTest::touchEvent(&ground, m_device).press(0, QPoint(50, 50));
+    QVERIFY(m_filter->isLock(nullptr, LOCKMETHOD_TOUCH));
+    QTest::touchEvent(&ground, m_device).press(1, QPoint(20, 20)).stationary(0);
+    QTest::touchEvent(&ground, m_device).release(0, QPoint(50, 50)).stationary(1);
+    QTest::touchEvent(&ground, m_device).release(1, QPoint(20, 20));
+    QTRY_VERIFY_WITH_TIMEOUT(!m_filter->isLock(nullptr, LOCKMETHOD_TOUCH), 1000);
+    touch(m_first, 0);
+    QCoreApplication::processEvents();
+    QVERIFY(m_filter->isLock(nullptr, LOCKMETHOD_TOUCH));
+    QTest::touchEvent(m_first, m_device).move(0, QPoint(12, 12));
+    QCoreApplication::processEvents();
+    QVERIFY(m_filter->isLock(nullptr, LOCKMETHOD_TOUCH));
+    lift(m_first, 0);
+    QCOMPARE(clicked.count(), 1);
 }
 
 void TestEventLocks::forcedLockBreaksTheTouch()
