@@ -60,6 +60,8 @@ private Q_SLOTS:
     void menuReportsItsActions();
     void tappingCanvasAgainClosesTheMenu();
     void touchBesideTheMenuOnlyCloses();
+    void fingerThatOpenedTheMenuIsLifted();
+    void mouseBesideTheMenuOnlyCloses();
     void menuMarksTheItemUnderTheFinger();
     void disablingLetsGoOfTheTouch();
     void textsAreTranslated();
@@ -379,6 +381,37 @@ void TestToolsBar::touchBesideTheMenuOnlyCloses()
     QCOMPARE(closed.count(), 0);
     QTest::touchEvent(close, m_device).press(0, QPoint(60, 20));
     QTest::touchEvent(close, m_device).release(0, QPoint(60, 20));
+    QCOMPARE(closed.count(), 1);
+}
+
+// It slid off the button, which opens the menu while the finger is still down.
+void TestToolsBar::fingerThatOpenedTheMenuIsLifted()
+{
+    KSPushbutton* canvas = button("Canvas");
+    QTest::touchEvent(canvas, m_device).press(0, QPoint(60, 20));
+    QVERIFY(!menu()->isVisible());
+    QTest::touchEvent(canvas, m_device).move(0, QPoint(60, -200));
+    QVERIFY(QTest::qWaitForWindowExposed(menu()));
+    QVERIFY(APPEventFilter::instance()->isLock(nullptr, LOCKMETHOD_TOUCH));
+    QTest::touchEvent(canvas, m_device).release(0, QPoint(60, -200));
+    QVERIFY(!APPEventFilter::instance()->isLock(nullptr, LOCKMETHOD_TOUCH));
+    QVERIFY(menu()->isVisible());
+    QTest::touchEvent(canvas, m_device).press(0, QPoint(60, 20));
+    QVERIFY(!menu()->isVisible());
+    QTest::touchEvent(canvas, m_device).release(0, QPoint(60, 20));
+    QVERIFY(!menu()->isVisible());
+    QVERIFY(!APPEventFilter::instance()->isLock(nullptr, LOCKMETHOD_TOUCH));
+}
+
+void TestToolsBar::mouseBesideTheMenuOnlyCloses()
+{
+    QSignalSpy closed(m_bar, &ToolsBar::closeButtonClick);
+    openMenu();
+    QTest::mouseClick(button("Close"), Qt::LeftButton);
+    QVERIFY(!menu()->isVisible());
+    QCOMPARE(closed.count(), 0);
+    QVERIFY(!button("Close")->isDown());
+    QTest::mouseClick(button("Close"), Qt::LeftButton);
     QCOMPARE(closed.count(), 1);
 }
 
