@@ -7,8 +7,11 @@
 #include "touchui/KSEventMutexLockObject.h"
 #include "touchui/KSInputContext.h"
 
+#include <QApplication>
 #include <QTouchEvent>
 #include <QWidget>
+#include <QWindow>
+#include <algorithm>
 
 namespace
 {
@@ -34,6 +37,14 @@ void logLock(const wchar_t* tag, const QString& verb, const QObject* obj)
     const QString text =
         verb + QString::fromLatin1(obj->metaObject()->className()) + QLatin1Char(' ') + obj->objectName();
     LOG_USER_OPERATE(tag, 207, text.toStdWString());
+}
+
+// Holders of locks are only remembered.
+bool isAlive(const QObject* holder)
+{
+    const QWidgetList widgets = QApplication::allWidgets();
+    return std::any_of(widgets.begin(), widgets.end(),
+                       [holder](const QWidget* widget) { return widget == holder; });
 }
 
 qsizetype pointCount(const QEvent* event)
@@ -77,16 +88,22 @@ bool KSAppEventFilter::doEventFilter(QObject* obj, QEvent* event)
             return false;
         }
         Q_EMIT signalEventBegin();
+        ++m_touchBegins;
         return !isEnable(obj) || doLock(obj, event) != 0;
     case QEvent::TouchUpdate:
     case QEvent::TouchEnd:
         if (obj->isWindowType()) {
+            if (event->type() == QEvent::TouchEnd && isLock(obj, LOCKMETHOD_TOUCH)) {
+                freeIgnoredTouches(obj);
+            }
             return false;
         }
         return !isEnable(obj) || doLock(obj, event) != 0;
     case QEvent::TouchCancel:
         // The end of a touch that no end will follow.
-        if (!obj->isWindowType() && isLock(obj, LOCKMETHOD_TOUCH)) {
+        if (obj->isWindowType()) {
+            freeIgnoredTouches(obj);
+        } else if (isLock(obj, LOCKMETHOD_TOUCH)) {
             tryUnlock(obj, LOCKMETHOD_TOUCH);
         }
         return false;
@@ -95,6 +112,27 @@ bool KSAppEventFilter::doEventFilter(QObject* obj, QEvent* event)
     default:
         return false;
     }
+}
+
+// The end of a touch reaches only a widget that accepted its begin. The last finger has left the window: once
+// its widgets have heard of it, whoever still holds a lock there would hold it until the watchdog bites.
+void KSAppEventFilter::freeIgnoredTouches(const QObject* window)
+{
+    const auto free = [this, window, begins = m_touchBegins] {
+        if (begins != m_touchBegins) {
+            return;
+        }
+        const QMap<KSLockObject*, QList<QObject*>> active = m_active;
+        for (const QList<QObject*>& holders : active) {
+            for (QObject* holder : holders) {
+                const QWidget* widget = isAlive(holder) ? qobject_cast<QWidget*>(holder) : nullptr;
+                if (widget && widget->window()->windowHandle() == window) {
+                    tryUnlock(holder, LOCKMETHOD_TOUCH);
+                }
+            }
+        }
+    };
+    QMetaObject::invokeMethod(this, free, Qt::QueuedConnection);
 }
 
 bool KSAppEventFilter::notifyRegEventFilter(QObject* obj, QEvent* event)

@@ -91,10 +91,12 @@ Q_SIGNALS:
     void signalEventBegin();
 
 private:
+    void freeIgnoredTouches(const QObject* window);
     static int priorityOf(LOCKOBJECT_TYPE type);
 
     QMap<int, QList<KSLockObject*>> m_registered; // by priority; 6 is asked first
     QMap<KSLockObject*, QList<QObject*>> m_active;
     QList<KSLockObject*> m_owned;
     QList<QObject*> m_eventFilters;
+    quint64 m_touchBegins = 0;
 };

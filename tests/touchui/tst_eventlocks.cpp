@@ -90,6 +90,7 @@ private Q_SLOTS:
     void disabledWidgetIsShut();
     void gestureIsSwallowed();
     void cancelFreesTheLock();
+    void ignoredTouchFreesTheLock();
     void forcedLockBreaksTheTouch();
     void registeredFiltersHearInOrder();
     void deletedFilterLeaves();
@@ -374,6 +375,30 @@ void TestEventLocks::cancelFreesTheLock()
     QCoreApplication::sendEvent(m_first, &cancel);
     QVERIFY(!m_filter->isLock(nullptr, LOCKMETHOD_TOUCH));
     lift(m_first, 0);
+}
+
+// A window that leaves touches to the mouse gets no end of them.
+void TestEventLocks::ignoredTouchFreesTheLock()
+{
+    QWidget window;
+    window.setAttribute(Qt::WA_AcceptTouchEvents);
+    window.resize(300, 200);
+    auto* button = new TouchEventButton(QStringLiteral("button"), &window);
+    button->setGeometry(200, 100, 80, 60);
+    window.show();
+    QVERIFY(QTest::qWaitForWindowExposed(&window));
+    QSignalSpy clicked(button, &QAbstractButton::clicked);
+    const QPoint blank(20, 20);
+    QTest::touchEvent(&window, m_device).press(0, blank, &window);
+    QVERIFY(m_filter->isLock(nullptr, LOCKMETHOD_TOUCH));
+    QTest::touchEvent(&window, m_device).release(0, blank, &window);
+    QTRY_VERIFY(!m_filter->isLock(nullptr, LOCKMETHOD_TOUCH));
+    const QPoint middle = button->rect().center();
+    QTest::touchEvent(&window, m_device).press(0, middle, button);
+    QVERIFY(m_filter->isLock(nullptr, LOCKMETHOD_TOUCH));
+    QTest::touchEvent(&window, m_device).release(0, middle, button);
+    QCOMPARE(clicked.count(), 1);
+    QVERIFY(!m_filter->isLock(nullptr, LOCKMETHOD_TOUCH));
 }
 
 void TestEventLocks::forcedLockBreaksTheTouch()
