@@ -33,6 +33,7 @@ private slots:
     void doubleTapOnASelectedObject();
     void tapAfterADoubleTap();
     void cancelledDragIsAStep();
+    void frameIsNoHandle();
     void secondFingerOnTheCanvas();
     void secondFingerOnAButton();
     void fingerOnAButtonBeforeTheCanvas();
@@ -436,6 +437,24 @@ void tst_taptable::cancelledDragIsAStep()
     QCOMPARE(item->getFocusFlag(), int(GraphicsText::FocusObject));
     canvas.stack.undo();
     QCOMPARE(item->scenePos(), QPointF(300.0, 200.0));
+}
+
+// The frame is drawn a little outside the text, where there is nothing to take hold of.
+void tst_taptable::frameIsNoHandle()
+{
+    TouchCanvas canvas(m_device);
+    canvas.show();
+    canvas.open({makeRecord("abc")});
+    GraphicsText* item = canvas.text(1);
+    for (const int taps : {0, 1}) {
+        if (taps > 0)
+            canvas.touchTap(canvas.pointOn(1));
+        const QPoint above = canvas.inView(*item, QPointF(item->layoutRect().center().x(), -1.0));
+        canvas.touchDrag(above, above + QPoint(80, -60));
+        QCOMPARE(item->scenePos(), QPointF(300.0, 200.0));
+        QCOMPARE(canvas.stack.count(), 0);
+        QCOMPARE(item->getFocusFlag(), int(GraphicsText::FocusNone));
+    }
 }
 
 void tst_taptable::secondFingerOnTheCanvas()
