@@ -75,6 +75,9 @@ void GraphicsText::initDataForGraphicsText()
     setFlag(ItemIsMovable);
     setFlag(ItemIsSelectable);
     setAcceptTouchEvents(true);
+    // The frame reaches out of the child; a finger there would drag the pair behind the child's back.
+    if (m_parentObject)
+        setAcceptedMouseButtons(Qt::NoButton);
     setAcceptDrops(false);
     // Undo steps are formed from the records; the document's own would contradict them.
     document()->setUndoRedoEnabled(false);

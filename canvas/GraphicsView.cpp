@@ -56,6 +56,10 @@ bool GraphicsView::viewportEvent(QEvent* event)
     case QEvent::TouchEnd:
         touchEnd(static_cast<QTouchEvent&>(*event));
         return true;
+    case QEvent::TouchCancel:
+        // Ends where the finger was, or the object under it would take every later touch for its own.
+        touchEnd(static_cast<QTouchEvent&>(*event));
+        return true;
     default:
         return QGraphicsView::viewportEvent(event);
     }
@@ -99,6 +103,7 @@ void GraphicsView::touchEnd(const QTouchEvent& touch)
         return;
     Q_EMIT deleteEmptyItem();
     const QPoint position = m_touchPoints.first().position().toPoint();
+    m_touchPoints.clear();
     QMouseEvent mouse = mouseEventAt(QEvent::MouseButtonRelease, position, viewport(), Qt::LeftButton,
                                      Qt::NoButton, touch.modifiers());
     mouseReleaseEvent(&mouse);

@@ -1,5 +1,7 @@
 #include "TouchCanvas.h"
 
+#include <QTouchEvent>
+
 #include "canvas/TouchTextEditor.h"
 
 // What one finger does to the text objects of a canvas, as touches that pass the application's gate: select,
@@ -30,6 +32,8 @@ private slots:
     void doubleTap();
     void doubleTapOnASelectedObject();
     void tapAfterADoubleTap();
+    void cancelledDragIsAStep();
+    void frameIsNoHandle();
     void secondFingerOnTheCanvas();
     void secondFingerOnAButton();
     void fingerOnAButtonBeforeTheCanvas();
@@ -405,6 +409,52 @@ void tst_taptable::tapAfterADoubleTap()
     QVERIFY(!item->textCursor().hasSelection());
     QCOMPARE(item->textCursor().position(), 2);
     QCOMPARE(item->getFocusFlag(), int(GraphicsText::FocusEdit));
+}
+
+// When the system takes a touch away, the object stays where it is, and lets go of the finger.
+void tst_taptable::cancelledDragIsAStep()
+{
+    TouchCanvas canvas(m_device);
+    canvas.show();
+    canvas.open({makeRecord("abc")});
+    GraphicsText* item = canvas.text(1);
+    canvas.touchTap(canvas.pointOn(1));
+    const QPoint from = canvas.pointOn(1);
+    canvas.slide(from, from + QPoint(80, 40));
+    const QPointF place = item->scenePos();
+    QVERIFY(place != QPointF(300.0, 200.0));
+    QTouchEvent cancel(QEvent::TouchCancel, m_device);
+    QCoreApplication::sendEvent(canvas.view.viewport(), &cancel);
+    canvas.view.mouseClick();
+    QCOMPARE(item->scenePos(), place);
+    QCOMPARE(item->getItemTText()->getXValue(), float(place.x()));
+    QCOMPARE(canvas.stack.count(), 1);
+    QCOMPARE(canvas.scene->mouseGrabberItem(), nullptr);
+    // A second one has nothing to end.
+    QTouchEvent again(QEvent::TouchCancel, m_device);
+    QCoreApplication::sendEvent(canvas.view.viewport(), &again);
+    QCOMPARE(canvas.stack.count(), 1);
+    QCOMPARE(item->getFocusFlag(), int(GraphicsText::FocusObject));
+    canvas.stack.undo();
+    QCOMPARE(item->scenePos(), QPointF(300.0, 200.0));
+}
+
+// The frame is drawn a little outside the text, where there is nothing to take hold of.
+void tst_taptable::frameIsNoHandle()
+{
+    TouchCanvas canvas(m_device);
+    canvas.show();
+    canvas.open({makeRecord("abc")});
+    GraphicsText* item = canvas.text(1);
+    for (const int taps : {0, 1}) {
+        if (taps > 0)
+            canvas.touchTap(canvas.pointOn(1));
+        const QPoint above = canvas.inView(*item, QPointF(item->layoutRect().center().x(), -1.0));
+        canvas.touchDrag(above, above + QPoint(80, -60));
+        QCOMPARE(item->scenePos(), QPointF(300.0, 200.0));
+        QCOMPARE(canvas.stack.count(), 0);
+        QCOMPARE(item->getFocusFlag(), int(GraphicsText::FocusNone));
+    }
 }
 
 void tst_taptable::secondFingerOnTheCanvas()
