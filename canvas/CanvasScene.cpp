@@ -169,6 +169,9 @@ GraphicsText* CanvasScene::buildPair(TText* record)
 
 GraphicsText* CanvasScene::rebuildItem(TText* record, TText& lastAlpha)
 {
+    // A canvas that had been emptied shows the texts of the file again when the title comes back.
+    if (GraphicsText* item = findTextItem(record->getTextObjectID()))
+        deleteItem(item);
     auto* parent = new GraphicsText(true, nullptr, this);
     parent->setPos(record->getXValue(), record->getYValue());
     parent->setZValue(record->getZValue());

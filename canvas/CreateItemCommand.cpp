@@ -3,14 +3,15 @@
 #include "canvas/CanvasScene.h"
 
 CreateItemCommand::CreateItemCommand(CanvasScene* scene, QUndoCommand* parent)
-    : QUndoCommand(parent), m_scene(scene), m_objectId(scene->initCGraphicsTextItem())
+    : QUndoCommand(parent), m_scene(scene), m_title(*scene), m_objectId(scene->initCGraphicsTextItem())
 {
 }
 
 void CreateItemCommand::undo()
 {
     m_scene->saveArchiveFlag();
-    if (GraphicsText* item = m_scene->findTextItem(m_objectId)) {
+    GraphicsText* item = m_title.isShown() ? m_scene->findTextItem(m_objectId) : nullptr;
+    if (item) {
         m_record.reset(item->getTextList());
         m_lastAlpha = *item->getLastAlpaTextStyleValue();
         m_scene->deleteItem(item);
@@ -22,7 +23,7 @@ void CreateItemCommand::undo()
 void CreateItemCommand::redo()
 {
     m_scene->saveArchiveFlag();
-    if (m_record) {
+    if (m_record && m_title.isShown()) {
         m_scene->rebuildItem(m_record.get(), m_lastAlpha);
         m_record.reset();
     }

@@ -1,5 +1,6 @@
 #pragma once
 
+#include "canvas/CommandTitle.h"
 #include "document/TText.h"
 
 #include <QUndoCommand>
@@ -23,6 +24,7 @@ public:
 
 private:
     CanvasScene* m_scene;
+    CommandTitle m_title;
     // Null until the first undo and after each redo.
     std::unique_ptr<TText> m_record;
     TText m_lastAlpha;

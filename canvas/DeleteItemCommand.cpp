@@ -3,14 +3,15 @@
 #include "canvas/CanvasScene.h"
 
 DeleteItemCommand::DeleteItemCommand(CanvasScene* scene, TText* record, QUndoCommand* parent)
-    : QUndoCommand(parent), m_scene(scene), m_record(*record)
+    : QUndoCommand(parent), m_scene(scene), m_title(*scene), m_record(*record)
 {
 }
 
 void DeleteItemCommand::undo()
 {
     m_scene->saveArchiveFlag();
-    m_scene->rebuildItem(&m_record, m_lastAlpha);
+    if (m_title.isShown())
+        m_scene->rebuildItem(&m_record, m_lastAlpha);
     m_scene->update();
     m_scene->saveArchive();
 }
@@ -18,7 +19,8 @@ void DeleteItemCommand::undo()
 void DeleteItemCommand::redo()
 {
     m_scene->saveArchiveFlag();
-    if (GraphicsText* item = m_scene->findTextItem(m_record.getTextObjectID())) {
+    GraphicsText* item = m_title.isShown() ? m_scene->findTextItem(m_record.getTextObjectID()) : nullptr;
+    if (item) {
         m_lastAlpha = *item->getLastAlpaTextStyleValue();
         m_scene->deleteItem(item);
     }

@@ -1,5 +1,6 @@
 #pragma once
 
+#include "canvas/CommandTitle.h"
 #include "document/TText.h"
 
 #include <QUndoCommand>
@@ -19,6 +20,7 @@ public:
 
 private:
     CanvasScene* m_scene;
+    CommandTitle m_title;
     TText m_record;
     TText m_lastAlpha;
 };

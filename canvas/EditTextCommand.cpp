@@ -10,6 +10,7 @@ EditTextCommand::EditTextCommand(TText* oldText, TText* newText, TText* oldLast,
                                  CanvasScene* scene, QUndoCommand* parent)
     : QUndoCommand(parent)
     , m_scene(scene)
+    , m_title(*scene)
     , m_oldText(*oldText)
     , m_newText(*newText)
     , m_oldLast(*oldLast)
@@ -20,7 +21,7 @@ EditTextCommand::EditTextCommand(TText* oldText, TText* newText, TText* oldLast,
 
 void EditTextCommand::showState(TText& text, TText& lastAlpha)
 {
-    GraphicsText* item = m_scene->findTextItem(text.getTextObjectID());
+    GraphicsText* item = m_title.isShown() ? m_scene->findTextItem(text.getTextObjectID()) : nullptr;
     if (!item)
         return;
     item->setLastAlpaTextStyleValue(lastAlpha);

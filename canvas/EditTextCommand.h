@@ -1,5 +1,6 @@
 #pragma once
 
+#include "canvas/CommandTitle.h"
 #include "document/TText.h"
 
 #include <QUndoCommand>
@@ -25,6 +26,7 @@ private:
     void showState(TText& text, TText& lastAlpha);
 
     CanvasScene* m_scene;
+    CommandTitle m_title;
     TText m_oldText;
     TText m_newText;
     TText m_oldLast;

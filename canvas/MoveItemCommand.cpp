@@ -8,6 +8,7 @@ MoveItemCommand::MoveItemCommand(CanvasScene* scene, int id, QPointF oldPosition
                                  QUndoCommand* parent)
     : QUndoCommand(parent)
     , m_scene(scene)
+    , m_title(*scene)
     , m_oldPosition(oldPosition)
     , m_newPosition(newPosition)
     , m_objectId(id)
@@ -17,7 +18,8 @@ MoveItemCommand::MoveItemCommand(CanvasScene* scene, int id, QPointF oldPosition
 void MoveItemCommand::moveTo(QPointF position)
 {
     m_scene->saveArchiveFlag();
-    if (GraphicsText* item = m_scene->findTextItem(m_objectId)) {
+    GraphicsText* item = m_title.isShown() ? m_scene->findTextItem(m_objectId) : nullptr;
+    if (item) {
         item->getItemTText()->setXValue(float(position.x()));
         item->getItemTText()->setYValue(float(position.y()));
         if (GraphicsText* parent = item->parentTextItem())

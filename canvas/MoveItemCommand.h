@@ -1,5 +1,7 @@
 #pragma once
 
+#include "canvas/CommandTitle.h"
+
 #include <QPointF>
 #include <QUndoCommand>
 
@@ -19,6 +21,7 @@ private:
     void moveTo(QPointF position);
 
     CanvasScene* m_scene;
+    CommandTitle m_title;
     QPointF m_oldPosition;
     QPointF m_newPosition;
     int m_objectId;

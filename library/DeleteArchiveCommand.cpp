@@ -23,6 +23,8 @@ void DeleteArchiveCommand::redo()
     if (!mItem)
         return;
     const QString path = mItem->getArchiveDataPath();
+    // Done again, it may meet another selection: a look around at a clean undo stack is no step.
+    mIsSelected = mIsSelected || mList->getSelectedArchive() == mItem;
     mItem->hide();
     mList->removeWidgetItem(mItem);
     mList->saveArchiveListOrder();

@@ -63,6 +63,18 @@ public:
         return {};
     }
 
+    // Packed arguments of every call of the method, in their order.
+    QList<QByteArray> argumentsOf(long service, long method) const
+    {
+        const std::lock_guard lock(mMutex);
+        QList<QByteArray> arguments;
+        for (const SiblingCall& call : mCalls) {
+            if (call.service == service && call.method == method)
+                arguments << call.data;
+        }
+        return arguments;
+    }
+
     void forget()
     {
         const std::lock_guard lock(mMutex);

@@ -1,0 +1,382 @@
+// A plain model of a title folder with its one undo stack: what list, files, selection and context list must
+// be after each step. It has no widgets, no files and no undo framework; records are kept by value.
+#pragma once
+
+#include "document/TText.h"
+
+#include <QList>
+#include <QMap>
+#include <QPointF>
+#include <QSet>
+#include <QString>
+#include <QStringList>
+#include <algorithm>
+#include <cmath>
+#include <optional>
+
+class LibraryModel
+{
+public:
+    static constexpr int UNDO_LIMIT = 25;
+
+    // Text objects by their number.
+    using Texts = QMap<int, TText>;
+
+    struct Title {
+        Texts saved;          // what its file holds
+        bool settled = false; // its pictures have been made from its texts since the folder was opened
+    };
+
+    struct Command {
+        enum Kind { PASTE, DELETE, MOVE, FOCUS, CREATE_TEXT, DELETE_TEXT, EDIT_TEXT, MOVE_TEXT };
+        Kind kind;
+        QString title;                    // that it acts on
+        QString other = {};               // FOCUS: the title before
+        int position = -1;                // PASTE: behind which; DELETE: where it was; MOVE: from where
+        int selected = -1;                // PASTE: selected before; MOVE: to where
+        bool wasSelected = false;         // DELETE
+        bool isNew = false;               // DELETE: made in this session
+        int id = 0;                       // of the text object
+        std::optional<TText> before = {}; // CREATE_TEXT: what undo took away
+        std::optional<TText> after = {};
+        QPointF from = {};
+        QPointF to = {};
+    };
+
+    QStringList order;
+    QMap<QString, Title> titles; // all that were ever seen, listed or not
+    QSet<QString> context;       // made in this session
+    QString selected;
+    QString canvas;
+    Texts live; // on the canvas
+    bool pictureNeeded = false;
+
+    // The folder is opened with these titles.
+    void open(const QStringList& stems)
+    {
+        order = stems;
+        context.clear();
+        clearStack();
+        selected.clear();
+        canvas.clear();
+        live.clear();
+        pictureNeeded = false;
+        for (Title& title : titles)
+            title.settled = false;
+        if (!order.isEmpty())
+            select(0);
+    }
+
+    bool canUndo() const { return mIndex > 0; }
+    bool canRedo() const { return mIndex < mCommands.size(); }
+
+    void clearStack()
+    {
+        mCommands.clear();
+        mIndex = 0;
+        mClean = 0;
+    }
+
+    // Titles that the operator has or can bring back.
+    QSet<QString> reachable() const
+    {
+        QSet<QString> stems(order.begin(), order.end());
+        for (const Command& command : mCommands)
+            stems << command.title << command.other;
+        stems.remove(QString());
+        return stems;
+    }
+
+    // The steps on the stack, with a bar before the one to be done next.
+    QString stack() const
+    {
+        static const char* const NAMES[] = {"paste",       "delete",      "move",      "focus",
+                                            "create text", "delete text", "edit text", "move text"};
+        QStringList told;
+        for (const Command& command : mCommands)
+            told << QStringLiteral("%1 %2 %3").arg(NAMES[command.kind], command.title).arg(command.id);
+        told.insert(mIndex, QStringLiteral("|"));
+        return told.join(QStringLiteral(", "));
+    }
+
+    // Steps of the operator. A title's texts come with it.
+    void paste(const QString& stem, const Texts& texts, int behind)
+    {
+        titles[stem].saved = texts;
+        Command command{Command::PASTE, stem};
+        command.position = std::clamp(behind, -1, int(order.size()) - 1);
+        command.selected = int(order.indexOf(selected));
+        pasteAgain(command);
+        push(command);
+        pictureNeeded = true;
+    }
+
+    void remove(const QString& stem)
+    {
+        Command command{Command::DELETE, stem};
+        command.position = int(order.indexOf(stem));
+        command.wasSelected = stem == selected;
+        removeAgain(command);
+        push(command);
+    }
+
+    void move(int from, int to)
+    {
+        if (from == to)
+            return;
+        order.move(from, to);
+        Command command{Command::MOVE, order.at(to)};
+        command.position = from;
+        command.selected = to;
+        push(command);
+    }
+
+    void focus(const QString& stem)
+    {
+        if (stem == selected)
+            return;
+        Command command{Command::FOCUS, stem, selected};
+        changeFocus(stem);
+        if (mIndex == mClean)
+            return; // a mere look around is no step
+        if (mIndex > 0 && mCommands[mIndex - 1].kind == Command::FOCUS) {
+            dropRedo();
+            mCommands[mIndex - 1].title = stem;
+            return;
+        }
+        push(command);
+    }
+
+    void createText(const TText& made)
+    {
+        live[made.getTextObjectID()] = made;
+        Command command{Command::CREATE_TEXT, canvas};
+        command.id = made.getTextObjectID();
+        push(command);
+        save();
+    }
+
+    void editText(const TText& before, const TText& after)
+    {
+        live[after.getTextObjectID()] = after;
+        Command command{Command::EDIT_TEXT, canvas};
+        command.id = after.getTextObjectID();
+        command.before = before;
+        command.after = after;
+        push(command);
+        save();
+    }
+
+    void deleteText(int id)
+    {
+        Command command{Command::DELETE_TEXT, canvas};
+        command.id = id;
+        command.before = live.take(id);
+        push(command);
+        save();
+    }
+
+    void moveText(int id, QPointF to)
+    {
+        Command command{Command::MOVE_TEXT, canvas};
+        command.id = id;
+        command.from = placeOf(live[id]);
+        command.to = to;
+        place(id, to);
+        push(command);
+        save();
+    }
+
+    void undo()
+    {
+        if (canUndo())
+            perform(mCommands[--mIndex], false);
+    }
+
+    void redo()
+    {
+        if (canRedo())
+            perform(mCommands[mIndex++], true);
+    }
+
+    // The canvas makes the pictures of the title that it shows.
+    void leave()
+    {
+        if (pictureNeeded && !canvas.isEmpty())
+            titles[canvas].settled = true;
+        pictureNeeded = false;
+    }
+
+    // Whether the pictures on disk must be those of the saved texts, once all have been written.
+    bool hasCurrentPictures(const QString& stem) const
+    {
+        return titles.value(stem).settled && !(stem == canvas && pictureNeeded);
+    }
+
+    static QPointF placeOf(const TText& text) { return {text.getXValue(), text.getYValue()}; }
+
+    static bool isSame(const TText& a, const TText& b)
+    {
+        constexpr float ROUNDED = 0.01F; // places are written with few digits
+        return a.getTextObjectID() == b.getTextObjectID() && a.getText() == b.getText() &&
+               std::abs(a.getXValue() - b.getXValue()) < ROUNDED &&
+               std::abs(a.getYValue() - b.getYValue()) < ROUNDED && a.getZValue() == b.getZValue() &&
+               a.getTextAlign() == b.getTextAlign() && a.shadowIsTheSame(b) && a.textItemsIsTheSame(b);
+    }
+
+    static bool isSame(const Texts& a, const Texts& b)
+    {
+        return std::equal(a.begin(), a.end(), b.begin(), b.end(),
+                          [](const TText& x, const TText& y) { return isSame(x, y); });
+    }
+
+private:
+    void select(int index)
+    {
+        const QString stem = order.value(index);
+        if (stem != selected && !selected.isEmpty())
+            leave();
+        selected = stem;
+        show(stem);
+    }
+
+    void changeFocus(const QString& stem)
+    {
+        if (stem.isEmpty() || stem == selected)
+            return;
+        leave();
+        selected = stem;
+        show(stem);
+    }
+
+    void show(const QString& stem)
+    {
+        canvas = stem;
+        live = titles.value(stem).saved;
+    }
+
+    // An empty canvas is not written: the file keeps its last texts. Texts without a character are not read
+    // back.
+    void save()
+    {
+        pictureNeeded = true;
+        if (canvas.isEmpty() || live.isEmpty())
+            return;
+        Texts& saved = titles[canvas].saved;
+        saved = live;
+        saved.removeIf([](const auto& entry) { return entry.value().getText().empty(); });
+    }
+
+    void place(int id, QPointF to)
+    {
+        if (!live.contains(id))
+            return;
+        live[id].setXValue(float(to.x()));
+        live[id].setYValue(float(to.y()));
+    }
+
+    void dropRedo()
+    {
+        mCommands.resize(mIndex);
+        if (mClean > mIndex)
+            mClean = -1;
+    }
+
+    void push(const Command& command)
+    {
+        dropRedo();
+        mCommands.append(command);
+        ++mIndex;
+        if (mCommands.size() > UNDO_LIMIT) {
+            mCommands.removeFirst();
+            --mIndex;
+            mClean = std::max<qsizetype>(mClean - 1, -1);
+        }
+    }
+
+    void pasteAgain(const Command& command)
+    {
+        order.insert(std::min<qsizetype>(command.position + 1, order.size()), command.title);
+        context << command.title;
+        select(command.position + 1);
+    }
+
+    void removeAgain(Command& command)
+    {
+        order.removeAll(command.title);
+        command.isNew = context.remove(command.title) || command.isNew;
+        command.wasSelected = command.wasSelected || selected == command.title;
+        if (command.wasSelected)
+            select(std::min<int>(command.position, int(order.size()) - 1));
+    }
+
+    void perform(Command& command, bool isRedo)
+    {
+        switch (command.kind) {
+        case Command::PASTE:
+            if (isRedo) {
+                pasteAgain(command);
+            } else {
+                order.removeAll(command.title);
+                context.remove(command.title);
+                select(command.selected);
+            }
+            return;
+        case Command::DELETE:
+            if (isRedo) {
+                removeAgain(command);
+            } else {
+                order.insert(command.position, command.title);
+                if (command.wasSelected)
+                    select(command.position);
+                if (command.isNew)
+                    context << command.title;
+            }
+            return;
+        case Command::MOVE:
+            order.removeAll(command.title);
+            order.insert(isRedo ? command.selected : command.position, command.title);
+            return;
+        case Command::FOCUS:
+            changeFocus(isRedo ? command.title : command.other);
+            return;
+        default:
+            if (command.title == canvas) // a look around may have put another title there
+                performOnText(command, isRedo);
+            save();
+        }
+    }
+
+    void performOnText(Command& command, bool isRedo)
+    {
+        switch (command.kind) {
+        case Command::CREATE_TEXT:
+            if (!isRedo && live.contains(command.id)) {
+                command.before = live.take(command.id);
+            } else if (isRedo && command.before) {
+                live[command.id] = *command.before;
+                command.before.reset();
+            }
+            break;
+        case Command::DELETE_TEXT:
+            if (isRedo)
+                live.remove(command.id);
+            else
+                live[command.id] = *command.before;
+            break;
+        case Command::EDIT_TEXT:
+            if (live.contains(command.id))
+                live[command.id] = isRedo ? *command.after : *command.before;
+            break;
+        case Command::MOVE_TEXT:
+            place(command.id, isRedo ? command.to : command.from);
+            break;
+        default:
+            break;
+        }
+    }
+
+    QList<Command> mCommands;
+    qsizetype mIndex = 0; // of the next command to redo
+    qsizetype mClean = 0; // -1 when it was dropped
+};
