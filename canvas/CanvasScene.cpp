@@ -169,9 +169,8 @@ GraphicsText* CanvasScene::buildPair(TText* record)
 
 GraphicsText* CanvasScene::rebuildItem(TText* record, TText& lastAlpha)
 {
-    // A canvas that had been emptied shows the texts of the file again when the title comes back.
-    if (GraphicsText* item = findTextItem(record->getTextObjectID()))
-        deleteItem(item);
+    if (GraphicsText* old = findTextItem(record->getTextObjectID()))
+        deleteItem(old); // came back with the file, which an emptied canvas does not overwrite
     auto* parent = new GraphicsText(true, nullptr, this);
     parent->setPos(record->getXValue(), record->getYValue());
     parent->setZValue(record->getZValue());

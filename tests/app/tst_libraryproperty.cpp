@@ -46,7 +46,7 @@ const int DEFAULT_STEPS = 1000;
 const int DEFAULT_STEPS = 5000;
 #endif
 const int STEPS_OF_A_SESSION = 400;
-const int STEPS_BETWEEN_WAITS = 20; // in which pictures may lag behind
+const int STEPS_BETWEEN_WAITS = 40; // in which pictures may lag behind
 const int COMFORTABLE_COUNT = 8;    // titles in the list, around which the session moves
 const long FILE_MANAGER = 36;
 const long UPDATE_TITLER_STATUS = 72;
@@ -160,8 +160,6 @@ private:
     int randomRow() { return random(int(mModel.order.size())); }
     int randomTextId();
     void request();
-
-    ArchiveList* list() const { return mList; }
 
     TemplateFixture mFixture;
     Siblings mSiblings;
@@ -297,9 +295,9 @@ bool tst_LibraryProperty::step()
         {7 + 4 * many, &tst_LibraryProperty::deleteTitle},
         {1, &tst_LibraryProperty::saveAsTemplate},
         {10, &tst_LibraryProperty::moveTitle},
-        {4, &tst_LibraryProperty::newText},
-        {4, &tst_LibraryProperty::editText},
-        {3, &tst_LibraryProperty::moveText},
+        {3, &tst_LibraryProperty::newText},
+        {3, &tst_LibraryProperty::editText},
+        {2, &tst_LibraryProperty::moveText},
         {2, &tst_LibraryProperty::deleteText}};
     int total = 0;
     for (const auto& action : actions)

@@ -37,6 +37,8 @@ private slots:
     void deleteAndUndo();
     void moveAndUndo();
     void undoWithoutObject();
+    void stepsOfAnotherTitleChangeNothing();
+    void anUndoneDeletionReplacesTheTextOfTheFile();
     void undoneObjectLeavesNoStep();
 
     void deleteSelectedLeavesEmptyOnes();
@@ -528,6 +530,44 @@ void tst_canvasscene::moveAndUndo()
     QCOMPARE(canvas.saved()->getText()[0]->getXValue(), 300.0F);
     canvas.stack.redo();
     QCOMPARE(canvas.saved()->getText()[0]->getXValue(), 10.0F);
+}
+
+void tst_canvasscene::stepsOfAnotherTitleChangeNothing()
+{
+    Canvas canvas;
+    canvas.open({makeRecord("abc")});
+    canvas.scene->slotCreateMoveUndoCommand(1, QPointF(0, 0), QPointF(50, 60));
+    canvas.text(1)->changeItemToSolidLineState();
+    canvas.scene->deleteSelectedItems();
+    canvas.stack.undo();
+    canvas.stack.undo();
+    Archive other;
+    other.setPath((canvas.folder.path() + "/other.xml").toStdString());
+    other.setText({new TText(makeRecord("xyz"))});
+    canvas.scene->slotUpdateArchive(&other);
+    const QPointF place = canvas.text(1)->scenePos();
+    canvas.stack.redo();
+    canvas.stack.redo();
+    QVERIFY(canvas.text(1));
+    QCOMPARE(canvas.text(1)->toPlainText(), QString("xyz"));
+    QCOMPARE(canvas.text(1)->scenePos(), place);
+    canvas.stack.undo();
+    QCOMPARE(canvas.scene->getTextItemList().size(), 1);
+}
+
+// An emptied canvas is not saved, so the file still has the text when the title is shown again.
+void tst_canvasscene::anUndoneDeletionReplacesTheTextOfTheFile()
+{
+    Canvas canvas;
+    canvas.open({makeRecord("abc")});
+    canvas.text(1)->changeItemToSolidLineState();
+    canvas.scene->deleteSelectedItems();
+    QCOMPARE(canvas.scene->getTextItemList().size(), 0);
+    canvas.scene->slotUpdateArchive(&canvas.title);
+    QCOMPARE(canvas.scene->getTextItemList().size(), 1);
+    canvas.stack.undo();
+    QCOMPARE(canvas.scene->getTextItemList().size(), 1);
+    QCOMPARE(canvas.text(1)->toPlainText(), QString("abc"));
 }
 
 void tst_canvasscene::undoWithoutObject()
