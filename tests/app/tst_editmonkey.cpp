@@ -1,0 +1,330 @@
+// Many touches anywhere on the canvas and the panel of the real window. TITLER_SEED repeats a run,
+// TITLER_TOUCHES changes its length: a hundred thousand take some minutes.
+#include "../canvas/StyleProperties.h"
+#include "MonkeyFingers.h"
+#include "Siblings.h"
+#include "app/APPEventFilter.h"
+#include "document/Archive.h"
+#include "document/ArchiveController.h"
+#include "document/ArchiveOrder.h"
+#include "document/TitleParser.h"
+#include "document/TitleParserUtility.h"
+#include "touchui/KSInputContext.h"
+
+#include <QDir>
+#include <QElapsedTimer>
+#include <QFile>
+#include <QFileInfo>
+#include <QProcess>
+#include <QTemporaryDir>
+
+namespace
+{
+
+#ifdef __SANITIZE_ADDRESS__
+constexpr int DefaultTouches = 1000;
+#else
+constexpr int DefaultTouches = 10000;
+#endif
+constexpr int ReplayedTouches = 2000;
+constexpr int DefaultSeed = 20231;
+constexpr int TouchesPerLook = 1000;
+constexpr int TouchesPerFrame = 50;
+constexpr int ReplayTimeout = 60000;
+// Set in a process that only runs the monkey and writes there what the title became.
+constexpr char DigestVariable[] = "TITLER_MONKEY_DIGEST";
+
+int number(const char* variable, int otherwise)
+{
+    bool ok = false;
+    const int value = qEnvironmentVariableIntValue(variable, &ok);
+    return ok && value > 0 ? value : otherwise;
+}
+
+// An application whose timers stand still when told to.
+class Application : public QApplication
+{
+public:
+    using QApplication::QApplication;
+    bool notify(QObject* receiver, QEvent* event) override
+    {
+        if (frozen && event->type() == QEvent::Timer)
+            return true;
+        return QApplication::notify(receiver, event);
+    }
+    bool frozen = false;
+};
+
+Application* application = nullptr;
+
+QString describe(const std::vector<TText*>& texts)
+{
+    QString description;
+    for (const TText* text : texts)
+        description += StyleProperties::describe(*text);
+    return description;
+}
+
+// The first lines that differ; empty when none does.
+QString difference(const QString& now, const QString& then)
+{
+    const QStringList a = now.split(QLatin1Char('\n'));
+    const QStringList b = then.split(QLatin1Char('\n'));
+    for (qsizetype i = 0; i < qMax(a.size(), b.size()); ++i) {
+        if (a.value(i) != b.value(i))
+            return QString("line %1 of %2, should be %3: '%4', should be '%5'")
+                .arg(i)
+                .arg(a.size())
+                .arg(b.size())
+                .arg(a.value(i), b.value(i));
+    }
+    return {};
+}
+
+// Places are written with six digits.
+float asSaved(float place)
+{
+    return QString::fromStdString(TitleParserUtility::fromDouble(place)).toFloat();
+}
+
+// Every step saves the title; in memory that does not wait for a disk.
+QString dataFolder()
+{
+    const QString memory = QStringLiteral("/dev/shm");
+    return QFileInfo(memory).isWritable() ? memory : QDir::tempPath();
+}
+
+QByteArray bytesOf(const QString& path)
+{
+    QFile file(path);
+    return file.open(QIODevice::ReadOnly) ? file.readAll() : QByteArray();
+}
+
+// Who holds the touch; empty when nobody does.
+QString heldLocks()
+{
+    QStringList held;
+    const auto locks = APPEventFilter::instance()->activateLockObjects();
+    for (auto lock = locks.begin(); lock != locks.end(); ++lock) {
+        held += QString("a lock of %1 objects is held by").arg(lock.key()->registeredObj().size());
+        for (const QObject* holder : lock.value())
+            held += QString::fromLatin1(holder->metaObject()->className()) + ' ' + holder->objectName();
+    }
+    return held.join('\n');
+}
+
+void showWarnings(QtMsgType type, const QMessageLogContext&, const QString& text)
+{
+    if (type == QtCriticalMsg || type == QtFatalMsg)
+        fprintf(stderr, "%s\n", qPrintable(text));
+}
+
+} // namespace
+
+class tst_editmonkey : public QObject
+{
+    Q_OBJECT
+
+private slots:
+    void initTestCase();
+    void cleanupTestCase();
+    void manyTouches();
+    void seedReplays();
+
+private:
+    QString writeFolder();
+    CanvasScene* scene() const { return mWindow->findChild<CanvasScene*>(); }
+    void look(int touches) const;
+    QString misplaced() const;
+    QByteArray replay(const QString& name);
+
+    QTemporaryDir mData{dataFolder() + QStringLiteral("/monkey-XXXXXX")};
+    Siblings mSiblings;
+    TitlerWindow* mWindow = nullptr;
+    QPointingDevice* mDevice = nullptr;
+    quint32 mSeed = 0;
+    int mTouches = 0;
+};
+
+void tst_editmonkey::initTestCase()
+{
+    mSeed = quint32(number("TITLER_SEED", DefaultSeed));
+    mTouches = number("TITLER_TOUCHES", DefaultTouches);
+    qInfo("seed %u, %d touches", mSeed, mTouches);
+    // A line for every save would be all that is to be seen.
+    qInstallMessageHandler(showWarnings);
+    QVERIFY(mSiblings.listenOnFreePorts());
+    APPEventFilter::instance();
+    Q_INIT_RESOURCE(UILibrary);
+    Q_INIT_RESOURCE(TitlerToolResource);
+    mDevice = QTest::createTouchDevice();
+    mWindow = new TitlerWindow(true, nullptr);
+    pMainWindow = mWindow;
+    mWindow->setRealClose(false);
+}
+
+void tst_editmonkey::cleanupTestCase()
+{
+    application->frozen = false;
+    delete mWindow;
+    pMainWindow = nullptr;
+    APPEventFilter::release();
+}
+
+QString tst_editmonkey::writeFolder()
+{
+    const QString folder = mData.filePath(QStringLiteral("monkey"));
+    QDir().mkpath(folder);
+    Archive archive;
+    archive.setPath((folder + "/title.xml").toStdString());
+    archive.setThumbnailBig("title_1920.png");
+    archive.setThumbnailMiddle("title_960.png");
+    archive.setThumbnailSmall("title_240.png");
+    archive.setThumbnailBlack("title_240S.png");
+    auto* first = new TText(makeRecord(QString::fromUtf8("First 快讯\nline 😀"), 1, "KST", 60));
+    auto* second = new TText(makeRecord(QStringLiteral("Second"), 2, "KST", 96));
+    second->setXValue(500.0F);
+    second->setYValue(400.0F);
+    second->setZValue(2.0F);
+    archive.setText({first, second});
+    TitleParser().writeOneTitle(&archive);
+
+    QList<ArchiveOrder*> rows{new ArchiveOrder};
+    rows.last()->setArchiveIndex(0);
+    rows.last()->setArchivePath("title.xml");
+    ArchiveController().saveArchiveListOrder(folder, rows);
+    qDeleteAll(rows);
+    return folder;
+}
+
+// The texts that are not shown where their record says; empty when all are.
+QString tst_editmonkey::misplaced() const
+{
+    QStringList wrong;
+    for (const GraphicsText* text : scene()->getTextItemList()) {
+        const TText& record = *text->getItemTText();
+        const QPointF off = text->scenePos() - QPointF(record.getXValue(), record.getYValue());
+        if (off.manhattanLength() > 0.01)
+            wrong +=
+                QString("text %1 is off by %2,%3").arg(record.getTextObjectID()).arg(off.x()).arg(off.y());
+    }
+    return wrong.join('\n');
+}
+
+// What holds at any moment.
+void tst_editmonkey::look(int touches) const
+{
+    const QList<GraphicsText*> texts = scene()->getTextItemList();
+    QVERIFY2(texts.size() <= CanvasScene::MAX_TEXT_OBJECTS, qPrintable(QString::number(touches)));
+    for (const GraphicsText* text : texts)
+        QVERIFY2(inStep(*text), qPrintable(QString("out of step after %1 touches").arg(touches)));
+    QVERIFY(mWindow->isVisible());
+}
+
+void tst_editmonkey::manyTouches()
+{
+    const QString folder = writeFolder();
+    const QString path = folder + "/title.xml";
+    mWindow->showTitlerWindow({_titler_paramter::CREATE_OR_EDIT, path.toStdWString()});
+    QVERIFY(QTest::qWaitForWindowExposed(mWindow));
+    QCOMPARE(scene()->getTextItemList().size(), 2);
+    application->frozen = true;
+    QElapsedTimer clock;
+    clock.start();
+
+    MonkeyFingers fingers(*mWindow, mDevice, mSeed);
+    for (int steps = 1; fingers.touches() < mTouches; ++steps) {
+        fingers.act();
+        if (!fingers.isTouching()) {
+            // The gate frees what is left once the widgets have had their turn.
+            QCoreApplication::sendPostedEvents(APPEventFilter::instance(), QEvent::MetaCall);
+            QVERIFY2(misplaced().isEmpty(),
+                     qPrintable(misplaced() + "\n" + fingers.lastTouches().join('\n')));
+            QVERIFY2(heldLocks().isEmpty(),
+                     qPrintable(heldLocks() + "\n" + fingers.lastTouches().join('\n')));
+        }
+        if (steps % TouchesPerFrame == 0)
+            QCoreApplication::processEvents();
+        if (steps % TouchesPerLook != 0)
+            continue;
+        look(fingers.touches());
+        if (QTest::currentTestFailed())
+            return;
+        mSiblings.forget();
+    }
+    fingers.liftAll();
+    application->frozen = false;
+    QCOMPARE(heldLocks(), QString());
+    const qint64 touched = clock.elapsed();
+
+    mWindow->hideSoftWareWithDeleteEmptyItems();
+    mWindow->saveCurrentTitle();
+    QTRY_VERIFY(mWindow->dataSaveIsFinished());
+    std::vector<TText*> shown;
+    const QList<GraphicsText*> texts = scene()->getTextItemList();
+    for (const GraphicsText* text : texts) {
+        TText* record = text->getItemTText();
+        record->setXValue(asSaved(record->getXValue()));
+        record->setYValue(asSaved(record->getYValue()));
+        shown.push_back(record);
+    }
+    Archive saved;
+    QCOMPARE(TitleParser().readOneTitle(path.toStdString(), &saved), 1);
+    QCOMPARE(difference(describe(saved.text()), describe(shown)), QString());
+    if (const QString digest = qEnvironmentVariable(DigestVariable); !digest.isEmpty()) {
+        QFile file(digest);
+        QVERIFY(file.open(QIODevice::WriteOnly));
+        file.write(describe(shown).toUtf8());
+    }
+    // The same title written again is the same file.
+    const QByteArray written = bytesOf(path);
+    QVERIFY(TitleParser().writeOneTitle(&saved));
+    QCOMPARE(bytesOf(path), written);
+    fprintf(stderr, "seed %u: %d touches in %lld ms, %d texts left\n", mSeed, fingers.touches(), touched,
+            int(shown.size()));
+
+    mWindow->closeTitlerWindow();
+    QVERIFY(!mWindow->isVisible());
+    mWindow->showTitlerWindow({_titler_paramter::CREATE_OR_EDIT, path.toStdWString()});
+    QCOMPARE(scene()->getTextItemList().size(), qsizetype(saved.text().size()));
+    for (const GraphicsText* text : scene()->getTextItemList())
+        QVERIFY(inStep(*text));
+    mWindow->closeTitlerWindow();
+}
+
+// A process of its own, since the panel remembers the last styles.
+QByteArray tst_editmonkey::replay(const QString& name)
+{
+    QProcess process;
+    QProcessEnvironment environment = QProcessEnvironment::systemEnvironment();
+    QDir(mData.path()).mkpath(name);
+    environment.insert(QStringLiteral("XDG_DATA_HOME"), mData.filePath(name));
+    environment.insert(QStringLiteral("TITLER_SEED"), QString::number(mSeed));
+    environment.insert(QStringLiteral("TITLER_TOUCHES"), QString::number(ReplayedTouches));
+    environment.insert(QString::fromLatin1(DigestVariable), mData.filePath(name + ".txt"));
+    process.setProcessEnvironment(environment);
+    process.start(QCoreApplication::applicationFilePath(), {QStringLiteral("manyTouches")});
+    if (!process.waitForFinished(ReplayTimeout) || process.exitCode() != 0)
+        return process.readAllStandardOutput();
+    return bytesOf(mData.filePath(name + ".txt"));
+}
+
+void tst_editmonkey::seedReplays()
+{
+    const QByteArray first = replay(QStringLiteral("first"));
+    QVERIFY2(first.startsWith("id"), first.constData());
+    QCOMPARE(replay(QStringLiteral("second")), first);
+}
+
+int main(int argc, char** argv)
+{
+    KSInputContext::install();
+    Application owned(argc, argv);
+    application = &owned;
+    owned.setObjectName(QStringLiteral("Titler"));
+    QApplication::setQuitOnLastWindowClosed(false);
+    tst_editmonkey test;
+    return QTest::qExec(&test, argc, argv);
+}
+
+#include "tst_editmonkey.moc"
