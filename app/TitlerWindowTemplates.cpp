@@ -83,7 +83,8 @@ void TitlerWindow::showTemplateDialog()
         return;
     }
     mFolderPicker->showOpacityWidget(false);
-    // Without a template the operator is back in the folder picker, which stays open over the darkened window.
+    // Without a template the operator is back in the folder picker, which stays open over the darkened
+    // window.
     if (!mTemplatePicker->isSelectedItem())
         mFolderPicker->setKeepFolderDialog();
 }

@@ -9,7 +9,6 @@
 #include "Siblings.h"
 #include "app/APPEventFilter.h"
 #include "app/EditContextController.h"
-#include "app/ShowMessageController.h"
 #include "app/TitlerWindow.h"
 #include "app/ToolsBar.h"
 #include "canvas/CanvasScene.h"
@@ -28,9 +27,8 @@
 #include <QApplication>
 #include <QCryptographicHash>
 #include <QElapsedTimer>
-#include <QPushButton>
+#include <QLoggingCategory>
 #include <QRandomGenerator>
-#include <QSignalSpy>
 #include <QTest>
 #include <QTextCursor>
 #include <QTimer>
@@ -194,6 +192,7 @@ private:
 
 void tst_LibraryProperty::initTestCase()
 {
+    QLoggingCategory::setFilterRules("*.debug=false"); // else the test library stops printing
     QVERIFY(mSiblings.listenOnFreePorts());
     mFixture.resetTemplates();
     mFixture.makePresets("templates_en", {"lower", "strap", "速報"});
@@ -247,9 +246,9 @@ void tst_LibraryProperty::request()
 void tst_LibraryProperty::randomSession()
 {
     const int steps = fromEnvironment("TITLER_PROPERTY_STEPS", DEFAULT_STEPS);
-    const quint32 seed =
-        quint32(fromEnvironment("TITLER_PROPERTY_SEED", QRandomGenerator::global()->bounded(1000000)));
+    const quint32 seed = quint32(fromEnvironment("TITLER_PROPERTY_SEED", 20261));
     mRandom.seed(seed);
+    qInfo("seed %u", seed);
     QElapsedTimer timer;
     timer.start();
 

@@ -4,7 +4,6 @@
 #include "panel/ComboxLineEditRegExpValidator.h"
 #include "panel/SizeBoxLineEdit.h"
 #include "panel/SizeToolBox.h"
-#include "touchui/KSCombobox.h"
 #include "touchui/CustomComboBoxView.h"
 #include "touchui/KSCombobox.h"
 #include "touchui/KSInputContext.h"

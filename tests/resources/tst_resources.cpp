@@ -65,8 +65,7 @@ QMultiMap<QString, QString> namedPictures()
 }
 
 // Paths that widgets take for a whole family, and the members that each family has.
-struct Family
-{
+struct Family {
     const char* path;
     QList<const char*> members;
 };
@@ -87,9 +86,9 @@ bool isCompleteFamily(const QString& path, const QStringList& existing)
 {
     for (const Family& family : FAMILIES) {
         if (path == QLatin1String(family.path)) {
-            return std::all_of(
-                family.members.begin(), family.members.end(),
-                [&](const char* member) { return existing.contains(path + QLatin1String(member)); });
+            return std::all_of(family.members.begin(), family.members.end(), [&](const char* member) {
+                return existing.contains(path + QLatin1String(member));
+            });
         }
     }
     return false;
