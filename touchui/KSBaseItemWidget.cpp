@@ -158,7 +158,8 @@ void KSBaseItemWidget::setPopup(bool popup)
     m_shadow->setEnabled(popup);
     m_popup = popup;
     // Its ground would show on the lifted look, which paints the handle itself.
-    m_handle->setVisible(m_dragFlag && !popup);
+    if (m_handle)
+        m_handle->setVisible(m_dragFlag && !popup);
     updateDragArea();
     update();
 }

@@ -202,7 +202,7 @@ void tst_idlerepaint::movedShadow_data()
     QTest::addColumn<QPointF>("step");
     QTest::newRow("whole pixels") << QPointF(300.0, 200.0) << QPointF(37.0, -12.0);
     QTest::newRow("between pixels") << QPointF(300.4, 200.7) << QPointF(-6.0, 6.0);
-    QTest::newRow("to another fraction") << QPointF(300.0, 200.0) << QPointF(0.5, 0.25);
+    QTest::newRow("to another fraction") << QPointF(300.0, 200.0) << QPointF(3.5, 0.25);
     QTest::newRow("over the edge") << QPointF(10.0, 200.0) << QPointF(-120.0, 0.0);
     QTest::newRow("from over the edge") << QPointF(-100.0, -30.0) << QPointF(150.0, 60.0);
 }
