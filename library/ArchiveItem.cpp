@@ -13,6 +13,8 @@
 #include <QLabel>
 #include <QPainter>
 #include <QPixmap>
+#include <QTextLayout>
+#include <QtMath>
 #include <algorithm>
 
 const QPoint ArchiveItem::LEFT_CHILD_POS(3, 2);
@@ -159,17 +161,20 @@ void ArchiveItem::updateRightChild()
     font.setPixelSize(mType == NARROW_ITEM ? NARROW_LABEL_HEIGHT - 4 : DISPLY_TEXT_SIZE);
     for (QLabel* label : mLabels) {
         label->setFont(font);
-        placeLine(label);
         label->clear();
     }
     setTextArea();
 }
 
-// Some families leave more room above and below than a line has. What is cut off then is room above the
-// letters and not their descenders.
+// Some families, also those that stand in for missing characters, leave more room above and below than a line
+// has. What is cut off then is room above the letters and not their descenders.
 void ArchiveItem::placeLine(QLabel* label) const
 {
-    const bool fits = QFontMetrics(label->font()).height() <= label->height();
+    QTextLayout layout(label->text(), label->font());
+    layout.beginLayout();
+    const QTextLine line = layout.createLine();
+    layout.endLayout();
+    const bool fits = !line.isValid() || qCeil(line.height()) <= label->height();
     label->setAlignment(Qt::AlignLeft | (fits ? Qt::AlignVCenter : Qt::AlignBottom));
 }
 
@@ -215,6 +220,7 @@ void ArchiveItem::setManyTextArea()
 void ArchiveItem::setLabelText(const QString& text, QLabel* label)
 {
     label->setText(QFontMetrics(label->font()).elidedText(text, Qt::ElideRight, label->width()));
+    placeLine(label);
 }
 
 QStringList ArchiveItem::textLines() const

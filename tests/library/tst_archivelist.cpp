@@ -7,6 +7,7 @@
 
 #include <QGraphicsView>
 #include <QLabel>
+#include <QScopeGuard>
 #include <QScrollBar>
 #include <QSignalSpy>
 #include <QTest>
@@ -40,6 +41,8 @@ private slots:
     void wheelHidesTheMenu();
     void saveRefreshesTheItem();
     void textLinesOfOneAndOfManyObjects();
+    void letterTailsAreWhole_data();
+    void letterTailsAreWhole();
     void itemStyles();
     void cloneOfAnItem();
     void followsARenamedFolder();
@@ -458,6 +461,47 @@ void tst_ArchiveList::textLinesOfOneAndOfManyObjects()
     archive.releaseVectorText();
     one.updateRightChild();
     QCOMPARE(one.textLines(), (QStringList{QString(), QString(), QString(), QString()}));
+}
+
+void tst_ArchiveList::letterTailsAreWhole_data()
+{
+    QTest::addColumn<QString>("family");
+    QTest::addColumn<QString>("text");
+    QTest::newRow("one script") << "KST"
+                                << "gjp";
+    QTest::newRow("characters of another family between") << "KST" << QStringLiteral("gjp 快讯 생방송");
+    QTest::newRow("a tall family") << "DFHeiW5-A" << QStringLiteral("gjp 快讯");
+}
+
+// A line is as high as it is, whatever the families need that stand in for missing characters.
+void tst_ArchiveList::letterTailsAreWhole()
+{
+    QFETCH(const QString, family);
+    QFETCH(const QString, text);
+    const QString before = ArchiveItem::SYSTEM_FONT_FAMILY;
+    const auto restore = qScopeGuard([&before] { ArchiveItem::setSystemFontFamily(before); });
+    ArchiveItem::setSystemFontFamily(family);
+    Archive archive;
+    archive.setText({LibraryFixture::makeText(text, 1)});
+    ArchiveItem shown(&archive, ArchiveItem::LIST_ITEM);
+    shown.initArchiveItemChildWidget();
+    auto* label = shown.findChild<QLabel*>();
+    QVERIFY(label);
+    QCOMPARE(label->text(), text);
+    const int letters = QFontMetrics(label->font()).horizontalAdvance(QStringLiteral("gjp"));
+    const auto ink = [label, letters] {
+        const QImage image = label->grab().toImage();
+        int pixels = 0;
+        for (int y = 0; y < image.height(); ++y) {
+            for (int x = 0; x < letters; ++x)
+                pixels += image.pixelColor(x, y).lightness() > 128 ? 1 : 0;
+        }
+        return pixels;
+    };
+    const int inTheLine = ink();
+    QVERIFY(inTheLine > 0);
+    label->setFixedHeight(4 * label->height());
+    QCOMPARE(inTheLine, ink());
 }
 
 void tst_ArchiveList::itemStyles()
