@@ -115,6 +115,9 @@ TitlerWindow::TitlerWindow(bool deferArchiveList, QWidget* parent)
 
 TitlerWindow::~TitlerWindow()
 {
+    // Events of children that go must not reach a window that is half gone.
+    if (APPEventFilter* filter = APPEventFilter::instance())
+        filter->unegisterEventFilter(this);
     // The canvas must be gone before the service links that its workers report through.
     mUndoStack.clear();
     delete mFolderPicker;
@@ -135,8 +138,6 @@ TitlerWindow::~TitlerWindow()
     EditContextController::clearInstance();
     TitlerProjectDataController::clearInstance();
     TitlerAPPEventFilterController::clearInstance();
-    if (APPEventFilter* filter = APPEventFilter::instance())
-        filter->unegisterEventFilter(this);
     if (mInputContext)
         mInputContext->setKeyBoardController(nullptr);
     if (mTranslator)

@@ -158,6 +158,7 @@ void tst_editmonkey::initTestCase()
     Q_INIT_RESOURCE(UILibrary);
     Q_INIT_RESOURCE(TitlerToolResource);
     mDevice = QTest::createTouchDevice();
+    mDevice->setParent(this);
     mWindow = new TitlerWindow(true, nullptr);
     pMainWindow = mWindow;
     mWindow->setRealClose(false);

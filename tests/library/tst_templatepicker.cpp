@@ -697,7 +697,11 @@ private:
     TemplateFixture mFixture;
     TitleReportRecorder mReports;
     MessageRecorder mMessages;
-    QPointingDevice* mDevice = QTest::createTouchDevice();
+    QPointingDevice* mDevice = [this] {
+        QPointingDevice* device = QTest::createTouchDevice();
+        device->setParent(this);
+        return device;
+    }();
     std::unique_ptr<TemplatePicker> mPicker;
 };
 

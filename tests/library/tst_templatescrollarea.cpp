@@ -259,7 +259,11 @@ private:
     QPushButton* pressed(int index) const { return mPressed->at(index).at(0).value<QPushButton*>(); }
     int value() const { return mArea->verticalScrollBar()->value(); }
 
-    QPointingDevice* mDevice = QTest::createTouchDevice();
+    QPointingDevice* mDevice = [this] {
+        QPointingDevice* device = QTest::createTouchDevice();
+        device->setParent(this);
+        return device;
+    }();
     std::unique_ptr<TemplateScrollArea> mArea;
     std::unique_ptr<QSignalSpy> mPressed;
     QList<QPushButton*> mButtons;
