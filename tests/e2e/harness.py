@@ -41,6 +41,7 @@ LIST_MENU_ROW = 60
 TEMPLATE_POINT = (431, 324)
 TEMPLATE_STEP = (258, 153)
 TEMPLATE_COLUMNS = 4
+TEMPLATE_HEADING = (294, 140, 130, 36)
 TEMPLATE_TABS = {"Preset": (356, 216), "User": (475, 216)}
 TEMPLATE_BUTTONS = {"Select": (1285, 907), "Cancel": (1514, 907), "Delete": (1491, 829)}
 # The folder picker: the middle of its first row and of its buttons.
@@ -309,7 +310,18 @@ class TitlerTest(unittest.TestCase):
     def choose_template(self, number, tab="Preset"):
         """Takes a template of the open picker, which closes it."""
         self.point_at_template(number, tab)
-        self.click(*TEMPLATE_BUTTONS["Select"])
+        self.leave_templates("Select")
+
+    def leave_templates(self, button):
+        """Clicks at a button of the open picker and waits until it has gone; a click before that is not for the window."""
+        def heading():
+            width, _, rgb = self.display.grab()
+            left, top, columns, rows = TEMPLATE_HEADING
+            return [rgb[3 * (y * width + left):3 * (y * width + left + columns)] for y in range(top, top + rows)]
+
+        picker = heading()
+        self.click(*TEMPLATE_BUTTONS[button])
+        session.wait_until(lambda: heading() != picker, 20 * SLOW, "the template picker to go")
         self.display.wait_until_still()
 
     def create_in_list(self, row, template=0):

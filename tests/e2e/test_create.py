@@ -61,8 +61,7 @@ class CreateTitles(harness.TitlerTest):
         self.click_tool("Close")
         self.display.wait_until_still()
         self.assertTrue(self.window())
-        self.click(*harness.TEMPLATE_BUTTONS["Cancel"])
-        harness.session.wait_until(lambda: self.display.grab() != picker, 20 * harness.SLOW, "the picker to go")
+        self.leave_templates("Cancel")
         self.close_window()
         self.assertEqual([title.path for title in self.titles(folder)], old)
 
