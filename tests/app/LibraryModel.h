@@ -35,7 +35,7 @@ public:
         int position = -1;                // PASTE: behind which; DELETE: where it was; MOVE: from where
         int selected = -1;                // PASTE: selected before; MOVE: to where
         bool wasSelected = false;         // DELETE
-        bool isNew = false;               // DELETE: made in this session
+        bool isNew = false;               // DELETE: made since the request
         int id = 0;                       // of the text object
         std::optional<TText> before = {}; // CREATE_TEXT: what undo took away
         std::optional<TText> after = {};
@@ -45,7 +45,7 @@ public:
 
     QStringList order;
     QMap<QString, Title> titles; // all that were ever seen, listed or not
-    QSet<QString> context;       // made in this session
+    QSet<QString> context;       // made since the request
     QString selected;
     QString canvas;
     Texts live; // on the canvas

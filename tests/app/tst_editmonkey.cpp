@@ -138,7 +138,7 @@ private:
     QString misplaced() const;
     QByteArray replay(const QString& name);
 
-    QTemporaryDir mData{dataFolder() + QStringLiteral("/monkey-XXXXXX")};
+    QTemporaryDir mData{dataFolder() + QStringLiteral("/monkey")};
     Siblings mSiblings;
     TitlerWindow* mWindow = nullptr;
     QPointingDevice* mDevice = nullptr;

@@ -43,6 +43,14 @@ public:
     void press(QPoint point) { touch(QEventPoint::Pressed, point); }
     void move(QPoint point) { touch(QEventPoint::Updated, point); }
     void release(QPoint point) { touch(QEventPoint::Released, point); }
+    // In steps as a finger makes them; it stays down.
+    void pressAndDrag(QPoint from, QPoint to)
+    {
+        constexpr int STEPS = 40;
+        press(from);
+        for (int step = 1; step <= STEPS; ++step)
+            move(from + (to - from) * step / STEPS);
+    }
     // A tap that is no part of a double tap.
     void touchTap(QPoint point)
     {

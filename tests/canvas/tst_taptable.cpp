@@ -282,9 +282,7 @@ void tst_taptable::dragAgainstALimit()
     canvas.touchTap(canvas.pointOn(1));
     const QPoint from = canvas.pointOn(1);
     const QPoint to = from + direction * 1600;
-    canvas.press(from);
-    for (int step = 1; step <= 40; ++step)
-        canvas.move(from + (to - from) * step / 40);
+    canvas.pressAndDrag(from, to);
     canvas.release(to);
     const QSizeF size = item->layoutRect().size();
     QPointF expected(300.0, 200.0);
@@ -330,9 +328,7 @@ void tst_taptable::fingerReturnsFromALimit()
     canvas.touchTap(canvas.pointOn(1));
     const QPoint from = canvas.pointOn(1);
     const QPoint to = from + direction * 1600;
-    canvas.press(from);
-    for (int step = 1; step <= 40; ++step)
-        canvas.move(from + (to - from) * step / 40);
+    canvas.pressAndDrag(from, to);
     const QPointF held = item->scenePos();
     const double reach =
         direction.x() != 0 ? item->layoutRect().width() - 100.0 : item->layoutRect().height() - 100.0;

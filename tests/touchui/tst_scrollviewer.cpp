@@ -1,5 +1,5 @@
 // A finger's life on a list: tap, hold, scroll, flick, brake, with others beside it.
-#include "ScrollViewerFixture.h"
+#include "ScrollViewerTest.h"
 
 #include "touchui/KSScrollBar.h"
 
@@ -8,14 +8,10 @@
 
 using Names = QStringList;
 
-class TestScrollViewer : public QObject
+class TestScrollViewer : public ScrollViewerTest
 {
     Q_OBJECT
 private Q_SLOTS:
-    void initTestCase();
-    void init();
-    void cleanup();
-
     void tap();
     void tapInTheGapBelongsToTheRowAbove();
     void tapBelowTheLastRow();
@@ -53,47 +49,7 @@ private Q_SLOTS:
     void stretchTimerAligns();
     void barUnderTheFinger();
     void pressOnTheBarBrakes();
-
-private:
-    void lift(int row);
-
-    QPointingDevice* m_device = nullptr;
-    QPointingDevice* m_other = nullptr; // a second screen
-    std::unique_ptr<ScrollViewerFixture> m;
 };
-
-void TestScrollViewer::initTestCase()
-{
-    m_device = QTest::createTouchDevice();
-    m_device->setParent(this);
-    m_other = QTest::createTouchDevice();
-    m_other->setParent(this);
-}
-
-void TestScrollViewer::init()
-{
-    m = std::make_unique<ScrollViewerFixture>(m_device);
-}
-
-void TestScrollViewer::cleanup()
-{
-    const bool locked = !m->mFilter.activateLockObjects().isEmpty();
-    m.reset();
-    QVERIFY2(!locked, "a touch lock is left");
-}
-
-// With a finger on the row's handle until it is off the list.
-void TestScrollViewer::lift(int row)
-{
-    m->mList->setItemsDragFlagAlignment(DRAGFLAG_LEFT);
-    m->fill(20);
-    m->mList->slotItemsCanDrag(true);
-    m->press(50, row * ScrollViewerFixture::ROW + 50);
-    m->clock.advance(50);
-    QVERIFY(m->mList->isDragging());
-    QCOMPARE(m->takeLog(), Names{QStringLiteral("lifted %1").arg(row)});
-    QCOMPARE(m->mList->count(), 19);
-}
 
 void TestScrollViewer::tap()
 {

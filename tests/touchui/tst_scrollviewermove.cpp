@@ -1,21 +1,14 @@
 // Rows lifted and dropped by a finger: places, edge scrolling, and what may happen to the list meanwhile.
-#include "ScrollViewerFixture.h"
-
-#include "touchui/KSScrollBar.h"
+#include "ScrollViewerTest.h"
 
 #include <QSignalSpy>
-#include <QWheelEvent>
 
 using Names = QStringList;
 
-class TestScrollViewerMove : public QObject
+class TestScrollViewerMove : public ScrollViewerTest
 {
     Q_OBJECT
 private Q_SLOTS:
-    void initTestCase();
-    void init();
-    void cleanup();
-
     void liftAndDrop();
     void dropAtTheEnd();
     void dropAtTheSamePlace();
@@ -34,47 +27,7 @@ private Q_SLOTS:
     void clearingWhileDragging();
     void deletedWhileDragging();
     void mouseLiftsAndDrops();
-
-private:
-    void lift(int row);
-
-    QPointingDevice* m_device = nullptr;
-    QPointingDevice* m_other = nullptr; // a second screen
-    std::unique_ptr<ScrollViewerFixture> m;
 };
-
-void TestScrollViewerMove::initTestCase()
-{
-    m_device = QTest::createTouchDevice();
-    m_device->setParent(this);
-    m_other = QTest::createTouchDevice();
-    m_other->setParent(this);
-}
-
-void TestScrollViewerMove::init()
-{
-    m = std::make_unique<ScrollViewerFixture>(m_device);
-}
-
-void TestScrollViewerMove::cleanup()
-{
-    const bool locked = !m->mFilter.activateLockObjects().isEmpty();
-    m.reset();
-    QVERIFY2(!locked, "a touch lock is left");
-}
-
-// With a finger on the row's handle until it is off the list.
-void TestScrollViewerMove::lift(int row)
-{
-    m->mList->setItemsDragFlagAlignment(DRAGFLAG_LEFT);
-    m->fill(20);
-    m->mList->slotItemsCanDrag(true);
-    m->press(50, row * ScrollViewerFixture::ROW + 50);
-    m->clock.advance(50);
-    QVERIFY(m->mList->isDragging());
-    QCOMPARE(m->takeLog(), Names{QStringLiteral("lifted %1").arg(row)});
-    QCOMPARE(m->mList->count(), 19);
-}
 
 void TestScrollViewerMove::liftAndDrop()
 {
