@@ -9,6 +9,7 @@
 #include <QAction>
 #include <QIcon>
 #include <QLabel>
+#include <QMenu>
 
 namespace
 {
@@ -65,6 +66,8 @@ GalleryPage GalleryPages::toolsBar()
     empty->resetToDefaultState();
     empty->slotDisableNewTextButton(true);
     page.pose = [full](Fingers& fingers) {
+        // The bar draws its menu through the application's filter, which is not there for a pose.
+        full->findChild<QMenu*>()->installEventFilter(full);
         full->findChild<KSPushbutton*>(QStringLiteral("SafeArea"))->click();
         fingers.pressWidget(0, full->findChild<KSPushbutton*>(QStringLiteral("Folder")), QPoint(60, 30));
         full->findChild<KSPushbutton*>(QStringLiteral("Canvas"))->click();
