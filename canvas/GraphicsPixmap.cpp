@@ -12,8 +12,7 @@ namespace
 // large.
 QPixmap readPicture(const QString& path)
 {
-    const QFileInfo info(path);
-    if (info.exists() && !info.isFile())
+    if (!QFileInfo(path).isFile())
         return {};
     QImageReader reader(path);
     return QPixmap::fromImageReader(&reader);

@@ -5,7 +5,7 @@ import signal
 import unittest
 
 import harness
-import touchscreen
+from libraryhands import LibraryTest
 
 NAME_IN_USE = 47
 ANSWER_OK = 2
@@ -13,35 +13,7 @@ TITLE_ADDED = 4
 NEW_FOLDER = "Untitled"
 
 
-class Folders(harness.TitlerTest):
-    display_class = touchscreen.TouchDisplay
-
-    def setUp(self):
-        super().setUp()
-        self.rows = self.folders()
-
-    def click(self, x, y, button=1):
-        left, top, _, _ = self.display.geometry(self.window())
-        self.display.tap(left + x, top + y)
-
-    def row_point(self, name):
-        x, y = harness.PICKER_ROW
-        return x, y + harness.PICKER_ROW_HEIGHT * self.rows.index(name)
-
-    def tap_row(self, name):
-        self.click(*self.row_point(name))
-        self.display.wait_until_still()
-
-    def open_picker_from_the_sub_panel(self):
-        self.command("sub")
-        self.wait_shown()
-
-    def type_name(self, name):
-        """As the keyboard does: the whole text, then its Enter key."""
-        self.command(f"string-enter {name}")
-        self.command("key Enter")
-        self.display.wait_until_still()
-
+class Folders(LibraryTest):
     def start_rename(self, name):
         """Holds a row until the file manager is told that the folder gets another name."""
         start = self.appliance.mark()

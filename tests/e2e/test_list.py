@@ -4,21 +4,13 @@ import shutil
 import unittest
 
 import harness
-import touchscreen
+from libraryhands import HANDLE, LibraryTest
 
 TITLES = 14
-# The middle of the first title's text and of its handle, and the Move button, in pixels of the screen.
-FIRST = (400, 140)
-HANDLE = (540, 133)
-MOVE = (520, 36)
 LIST_BOTTOM = 1062
-MENU_ROW = {"Copy": 110, "Paste": 170, "Delete": 230}  # under the place that was held
-ORDER_NOTICE = ("FileManagerController", "updateTitlerOrder")
 
 
-class TitleList(harness.TitlerTest):
-    display_class = touchscreen.TouchDisplay
-
+class TitleList(LibraryTest):
     def setUp(self):
         super().setUp()
         self.long = self.long_folder()
@@ -54,53 +46,15 @@ class TitleList(harness.TitlerTest):
     def wait_order(self, order):
         harness.session.wait_until(lambda: self.order() == order, 20 * harness.SLOW, f"the order {order}")
 
-    def part(self, left, top, right, bottom):
-        """The pixels of a part of the screen."""
-        width, _, rgb = self.display.grab()
-        return b"".join(rgb[3 * (row * width + left):3 * (row * width + right)] for row in range(top, bottom))
-
-    def canvas(self):
-        left, top, width, height = harness.CANVAS
-        return self.part(left, top, left + width, top + height)
-
     def thumbnails(self):
         return self.part(60, 70, 560, 1060)
-
-    def hold(self, x, y):
-        """A finger that stays until the menu covers what is two titles further down."""
-        def below():
-            return self.part(x - 50, y + 200, x + 50, y + 240)
-
-        before = below()
-        self.display.down(x, y)
-        harness.session.wait_until(lambda: below() != before, 20 * harness.SLOW, "the menu")
-        self.display.wait_until_still()
-        self.display.up(x, y)
-
-    def lift(self):
-        before = self.display.grab()
-        self.display.down(*HANDLE)
-        harness.session.wait_until(lambda: self.display.grab() != before, 20 * harness.SLOW, "the lifted title")
-
-    def carry_to(self, y):
-        for place in range(HANDLE[1], y, 15):
-            self.display.move(HANDLE[0], place)
-        self.display.move(HANDLE[0], y)
-        self.display.wait_until_still()
-
-    def drop(self, y):
-        start = self.appliance.mark()
-        self.display.up(HANDLE[0], y)
-        self.wait_call(*ORDER_NOTICE, start)
-        self.display.wait_until_still()
 
     def undo(self):
         self.display.tap(*harness.TOOL_POINTS["Undo"])
 
     def test_titles_are_carried_and_taken_back(self):
         original = list(range(TITLES))
-        self.display.tap(*MOVE)
-        self.display.wait_until_still()
+        self.tap_move()
         self.lift()
         self.carry_to(HANDLE[1] + 2 * harness.LIST_ROW)
         self.drop(HANDLE[1] + 2 * harness.LIST_ROW)
@@ -125,18 +79,13 @@ class TitleList(harness.TitlerTest):
         self.assert_no_leftovers(self.long)
 
     def test_held_titles_are_copied_and_deleted(self):
-        x, y = FIRST
-        self.hold(x, y)
-        self.display.tap(x, y + MENU_ROW["Copy"])
-        self.display.wait_until_still()
-        self.hold(x, y)
-        self.display.tap(x, y + MENU_ROW["Paste"])
+        self.choose_in_list_menu(0, "Copy")
+        self.choose_in_list_menu(0, "Paste")
         self.wait_titles(self.long, TITLES + 1)
         self.display.wait_until_still()
         pasted = self.titles(self.long)[1]
         self.assertEqual(pasted.texts(), self.titles(self.long)[0].texts())
-        self.hold(x, y + harness.LIST_ROW)
-        self.display.tap(x, y + harness.LIST_ROW + MENU_ROW["Delete"])
+        self.choose_in_list_menu(1, "Delete")
         self.wait_titles(self.long, TITLES)
         self.assertEqual(self.order(), list(range(TITLES)))
         self.close_window()

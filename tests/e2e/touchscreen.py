@@ -160,6 +160,7 @@ class TouchDisplay(session.Display):
     def __init__(self, folder, environment):
         self.device = None
         self.reader = None
+        self.touching = {}
         super().__init__(folder, environment)
         try:
             self.device = TouchDevice(os.path.join(folder, "touch"))
@@ -192,6 +193,7 @@ class TouchDisplay(session.Display):
         return session.WIDTH, session.HEIGHT, bytes(rgb)
 
     def down(self, x, y, finger=0):
+        self.touching[finger] = (x, y)
         self.device.send(TOUCH_BEGIN, finger, x, y)
 
     def move(self, x, y, finger=0):
@@ -199,6 +201,12 @@ class TouchDisplay(session.Display):
 
     def up(self, x, y, finger=0):
         self.device.send(TOUCH_END, finger, x, y)
+        self.touching.pop(finger, None)
+
+    def lift_all(self):
+        """Lifts the fingers that a test, cut off in a gesture, has left on the screen."""
+        for finger, place in list(self.touching.items()):
+            self.up(*place, finger)
 
     def tap(self, x, y, finger=0):
         self.down(x, y, finger)

@@ -64,6 +64,37 @@ class Connection:
         self.socket.close()
 
 
+class Asker:
+    """A sibling that asks for new titles. It listens at a port of its own, to which the titler connects to answer."""
+
+    CLIENT, RECEIVER = 1001, 2
+    ADAPTER = 9
+
+    def __init__(self, offset, timeout=20):
+        self.listener = socket.create_server(("127.0.0.1", self.CLIENT + offset))
+        self.listener.settimeout(timeout * harness.SLOW)
+        self.calls = Connection(offset, timeout)
+        self.answers = None
+
+    def ask(self, call_type):
+        self.calls.call(REGISTER, pack_int32(self.ADAPTER) + pack_int32(self.CLIENT))
+        self.calls.call(SHOW_CREATE, pack_int(call_type))
+
+    def answer(self):
+        """The next frame that the titler sends back, acknowledged."""
+        if self.answers is None:
+            self.answers, _ = self.listener.accept()
+            self.answers.settimeout(self.listener.gettimeout())
+        data = peer.read_exactly(self.answers, FRAME_SIZE)
+        self.answers.sendall(peer.ACKNOWLEDGEMENT)
+        return data
+
+    def close(self):
+        for end in (self.answers, self.calls, self.listener):
+            if end:
+                end.close()
+
+
 def resident(pid):
     """Kilobytes of memory that a process has in use."""
     with open(f"/proc/{pid}/status", encoding="ascii") as status:

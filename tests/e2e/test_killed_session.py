@@ -1,0 +1,102 @@
+"""A titler that is killed at any moment of an operator's session in the title library: the next one shows every title
+that was saved. TITLER_KILLS is the number of sessions; TITLER_SEED repeats a run, as far as a machine can."""
+import os
+import random
+import shutil
+import time
+import unittest
+
+import harness
+import wire
+from librarysession import COPY, FOLDER, LibrarySession
+from mortal import MortalTitler
+
+KILLS = int(os.environ.get("TITLER_KILLS", "5"))
+
+
+class KilledSession(MortalTitler, LibrarySession):
+    def play(self):
+        """The session; what each step leaves is noted when it is done, what it may take away before it begins."""
+        for step in self.STEPS:
+            self.doing = step.__name__
+            if step is LibrarySession.delete_and_undo:
+                self.saved[FOLDER].pop(os.path.basename(self.new_titles()[0].stem))
+            step(self)
+            self.note_saved()
+
+    def found(self):
+        """The texts of each title in each folder, as the order files name them."""
+        return {name: {os.path.basename(title.stem): title.texts() for title in self.titles(self.folder(name))}
+                for name in self.folders() if os.path.exists(os.path.join(self.folder(name), ".order.xml"))}
+
+    def assert_nothing_lost(self):
+        found = self.found()
+        for folder, titles in self.saved.items():
+            for stem, texts in titles.items():
+                self.assertIn(stem, found.get(folder, {}), folder)
+                # A text more may have been saved since.
+                self.assertEqual(found[folder][stem][:len(texts)], texts, (folder, stem))
+        self.assertLessEqual(set(self.saved_templates), {title.path for title in self.user_templates()})
+        self.assertEqual(wire.broken_files(self.base), {})
+
+    def rows_shown(self):
+        """How many of the first titles the list shows: a row's picture is not of one colour."""
+        count = 0
+        for row in range(6):
+            x, y = self.list_point(row)
+            pixels = self.part(x - 300, y - 40, x - 150, y + 40)
+            if len({pixels[at:at + 3] for at in range(0, len(pixels), 3)}) == 1:
+                break
+            count += 1
+        return count
+
+    def note_saved(self):
+        super().note_saved()
+        self.saved_templates = [title.path for title in self.user_templates()]
+
+    def show(self, name):
+        """Opens a folder and closes it again, which takes nothing from it."""
+        before = self.found()[name]
+        start = self.appliance.mark()
+        self.command(f'edit "{self.folder(name)}"')
+        self.wait_call("FileManagerController", "titlerEditStatus", start)
+        self.wait_shown()
+        self.assertEqual(self.rows_shown(), len(before))
+        self.screenshot("shown.png")
+        self.close_window()
+        self.wait_no_leftovers(self.folder(name))
+        self.assertEqual(self.found()[name], before)
+
+    def clear(self):
+        for name in (FOLDER, COPY):
+            shutil.rmtree(self.folder(name), ignore_errors=True)
+        self.rows = self.folders()
+
+    def test_every_saved_title_is_there_after_a_kill(self):
+        rng, seed = self.seeded()
+        if "TITLER_SEED" in os.environ:
+            seed = int(os.environ["TITLER_SEED"])
+            rng = random.Random(seed)
+        self.note_saved()
+        begin = time.monotonic()
+        self.play()
+        length = time.monotonic() - begin
+        self.clear()
+        for turn in range(KILLS):
+            with self.subTest(turn=turn, seed=seed):
+                self.note_saved()
+                after = rng.uniform(0, length)
+                self.kill_during(self.play, after)
+                self.display.lift_all()
+                print(f"turn {turn}: killed after {after:.1f} of {length:.1f} s in {self.doing}", flush=True)
+                self.assert_nothing_lost()
+                self.start_titler()
+                for name in self.found():
+                    if name in (FOLDER, COPY, "Welcome") and self.found()[name]:
+                        self.show(name)
+                self.assert_nothing_lost()
+                self.clear()
+
+
+if __name__ == "__main__":
+    unittest.main()
