@@ -29,6 +29,7 @@
 #include "touchui/KSPushbutton.h"
 #include "touchui/KSScrollViewerWidget.h"
 #include "touchui/KSToolTip.h"
+#include "touchui/WindowPlaceKeeper.h"
 
 #include <QAction>
 #include <QApplication>
@@ -95,6 +96,7 @@ TitlerWindow::TitlerWindow(bool deferArchiveList, QWidget* parent)
 
     setWindowTitle(tr("Titler"));
     setGeometry(MAIN_RECT);
+    new WindowPlaceKeeper(this); // child of this
     QPalette windowPalette = palette();
     windowPalette.setColor(QPalette::Window, Qt::black);
     setPalette(windowPalette);

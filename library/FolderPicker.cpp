@@ -13,6 +13,7 @@
 #include "touchui/KSPushbutton.h"
 #include "touchui/KSTreeModel.h"
 #include "touchui/KSTreeView.h"
+#include "touchui/WindowPlaceKeeper.h"
 
 #include <QHeaderView>
 #include <QKeyEvent>
@@ -64,6 +65,7 @@ FolderPicker::FolderPicker(QWidget* parent)
     setStyleSheet(QStringLiteral("QDialog#FolderPickerWindow {font-size:24px; background:rgb(50, 50, 50);}"));
     setAttribute(Qt::WA_AcceptTouchEvents);
     setFixedSize(FOLDER_PICKER_SIZE);
+    new WindowPlaceKeeper(this); // child of this
     createTree();
     createDetails();
     createButtons();

@@ -7,6 +7,7 @@
 #include "library/TemplateTab.h"
 #include "library/TitlerTabWidget.h"
 #include "touchui/KSPushbutton.h"
+#include "touchui/WindowPlaceKeeper.h"
 
 #include <QFontMetrics>
 #include <QLabel>
@@ -60,6 +61,7 @@ TemplatePicker::TemplatePicker(QWidget* parent)
     setObjectName(QStringLiteral("TemplateOverview"));
     setStyleSheet(QStringLiteral(" QWidget#TemplateOverview { background:transparent; }"));
     setAttribute(Qt::WA_TranslucentBackground);
+    new WindowPlaceKeeper(this); // child of this
     setAttribute(Qt::WA_AcceptTouchEvents);
     setFixedSize(SCREEN_SIZE);
     mTitle = createLabel(this, QRect(TABS_LEFT, OUTER_MARGIN_HIGHT, TAB_AREA_WIDTH, LINE_RECT.top() - 9),

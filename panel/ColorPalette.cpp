@@ -5,6 +5,7 @@
 #include "panel/ToolBox.h"
 #include "touchui/FlickMotion.h"
 #include "touchui/KSInputContext.h"
+#include "touchui/WindowPlaceKeeper.h"
 
 #include <QGridLayout>
 #include <QHBoxLayout>
@@ -43,6 +44,7 @@ ColorPalette::ColorPalette(QWidget* parent) : QDialog(parent, Qt::Dialog | Qt::F
     setObjectName(QStringLiteral("ColorPalette"));
     setFixedSize(PALETTE_WIDTH, PALETTE_HEIGHT);
     setAttribute(Qt::WA_AcceptTouchEvents);
+    new WindowPlaceKeeper(this); // child of this
     initColorValueList();
     createButtons();
     createLayout();

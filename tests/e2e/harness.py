@@ -48,6 +48,8 @@ TEMPLATE_BUTTONS = {"Select": (1285, 907), "Cancel": (1514, 907), "Delete": (149
 PICKER_ROW = (800, 306)
 PICKER_ROW_HEIGHT = 48
 PICKER_BUTTONS = {"Duplicate": (513, 857), "New Folder": (681, 857), "Open": (1247, 857), "Cancel": (1415, 857)}
+# Points of the pickers' Cancel buttons beside the text, which are brighter than anything else of the window there.
+PICKER_LIT, TEMPLATES_LIT, LIT = (1350, 840), (1454, 890), 65
 PICTURES = {"_1920.png": (1920, 1080), "_960.png": (960, 540), "_240.png": (240, 135), "_240S.png": (240, 135)}
 
 
@@ -213,8 +215,19 @@ class TitlerTest(unittest.TestCase):
 
     def titles(self, folder):
         """The title files of a folder in its order."""
-        order = xml.etree.ElementTree.parse(os.path.join(folder, ".order.xml")).getroot()
-        return [Title(os.path.join(folder, row.get("file-path"))) for row in order.iter("index")]
+        return [Title(os.path.join(folder, row.get("file-path"))) for row in self.read_order(folder).iter("index")]
+
+    @staticmethod
+    def read_order(folder):
+        """The order file of a folder. While it is written it is not there, or not whole."""
+        deadline = time.monotonic() + 2
+        while True:
+            try:
+                return xml.etree.ElementTree.parse(os.path.join(folder, ".order.xml")).getroot()
+            except (FileNotFoundError, xml.etree.ElementTree.ParseError):
+                if time.monotonic() > deadline:
+                    raise
+                time.sleep(0.01)
 
     # The window
 
@@ -260,9 +273,19 @@ class TitlerTest(unittest.TestCase):
         root = os.path.dirname(self.folder())
         return sorted((name for name in os.listdir(root) if os.path.isdir(os.path.join(root, name))), key=str.lower)
 
+    def pixel(self, x, y):
+        """A pixel of the screen, which the window fills."""
+        width, _, rgb = self.display.grab()
+        return tuple(rgb[3 * (y * width + x):3 * (y * width + x) + 3])
+
+    def wait_picker(self, lit=PICKER_LIT):
+        """Waits until the folder picker is there and no mask before it; a click before that is not for it."""
+        session.wait_until(lambda: min(self.pixel(*lit)) > LIT, 20 * SLOW, "the picker")
+        self.display.wait_until_still()
+
     def open_picker(self):
         self.click_tool("Folder")
-        self.display.wait_until_still()
+        self.wait_picker()
 
     def click_folder(self, name):
         """Clicks at a folder's row in the picker, in which no folder is open and nothing is scrolled."""
@@ -300,7 +323,8 @@ class TitlerTest(unittest.TestCase):
         self.display.wait_until_still()
 
     def point_at_template(self, number, tab="Preset"):
-        """In the open template picker, turns to the tab and chooses a template of the first rows."""
+        """When the template picker is open, turns to the tab and chooses a template of the first rows."""
+        self.wait_picker(TEMPLATES_LIT)
         self.click(*TEMPLATE_TABS[tab])
         self.display.wait_until_still()
         row, column = divmod(number, TEMPLATE_COLUMNS)

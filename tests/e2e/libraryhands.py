@@ -101,6 +101,7 @@ class LibraryTest(harness.TitlerTest):
     def open_picker_from_the_sub_panel(self):
         self.command("sub")
         self.wait_shown()
+        self.wait_picker()
 
     def type_name(self, name):
         """As the keyboard does: the whole text, then its Enter key."""

@@ -28,10 +28,14 @@ class LibrarySession(LibraryTest):
     def new_titles(self):
         return self.titles(self.folder(FOLDER))
 
+    def found(self):
+        """The texts of each title in each folder, as the order files name them."""
+        return {name: {os.path.basename(title.stem): title.texts() for title in self.titles(self.folder(name))}
+                for name in self.folders() if os.path.exists(os.path.join(self.folder(name), ".order.xml"))}
+
     def note_saved(self):
         """Keeps what is on disk now, which nothing may take away any more but the operator."""
-        self.saved = {name: {os.path.basename(title.stem): title.texts() for title in self.titles(self.folder(name))}
-                      for name in self.folders() if os.path.exists(os.path.join(self.folder(name), ".order.xml"))}
+        self.saved = self.found()
 
     def user_templates(self):
         return self.titles(os.path.join(self.base, "resources", "TitlerTemplates"))
@@ -45,6 +49,7 @@ class LibrarySession(LibraryTest):
         self.addCleanup(self.asker.close)
         self.asker.ask(CALL_TYPE)
         self.wait_shown()
+        self.wait_picker()
 
     def make_folder(self):
         start = self.appliance.mark()

@@ -63,10 +63,6 @@ class PanelTest(harness.TitlerTest):
         self.display.up(*places[-1])
         self.display.wait_until_still()
 
-    def pixel(self, x, y):
-        width, _, rgb = self.display.grab()
-        return tuple(rgb[3 * (y * width + x):3 * (y * width + x) + 3])
-
     def handle_shows(self):
         """A handle is blue, darker or lighter; the title has no other blue."""
         red, _, blue = self.pixel(*HANDLE)

@@ -173,6 +173,7 @@ class Folders(LibraryTest):
         start = self.appliance.mark()
         self.command("create 7")
         self.wait_shown()
+        self.wait_picker()
         # Folders are made once one has been chosen.
         self.click_picker("New Folder")
         self.assertEqual(self.calls("SoftKeyBoardController", "show", start), [])

@@ -15,6 +15,9 @@ KILLS = int(os.environ.get("TITLER_KILLS", "5"))
 
 
 class KilledSession(MortalTitler, LibrarySession):
+    doing = "nothing"
+    saved_templates = ()
+
     def play(self):
         """The session; what each step leaves is noted when it is done, what it may take away before it begins."""
         for step in self.STEPS:
@@ -24,18 +27,23 @@ class KilledSession(MortalTitler, LibrarySession):
             step(self)
             self.note_saved()
 
-    def found(self):
-        """The texts of each title in each folder, as the order files name them."""
-        return {name: {os.path.basename(title.stem): title.texts() for title in self.titles(self.folder(name))}
-                for name in self.folders() if os.path.exists(os.path.join(self.folder(name), ".order.xml"))}
-
-    def assert_nothing_lost(self):
-        found = self.found()
+    def assert_files_whole(self):
+        """What was saved lies there whole; the order file is rewritten in its place, and made anew by the next start."""
         for folder, titles in self.saved.items():
             for stem, texts in titles.items():
-                self.assertIn(stem, found.get(folder, {}), folder)
+                path = os.path.join(self.folder(folder), stem + ".xml")
                 # A text more may have been saved since.
-                self.assertEqual(found[folder][stem][:len(texts)], texts, (folder, stem))
+                self.assertEqual(harness.Title(path).texts()[:len(texts)], texts, path)
+        for template in self.saved_templates:
+            self.assertTrue(os.path.exists(template), template)
+        broken = wire.broken_files(self.base)
+        self.assertEqual({path: broken[path] for path in broken if not path.endswith("/.order.xml")}, {})
+
+    def assert_nothing_lost(self):
+        self.assert_files_whole()
+        found = self.found()
+        for folder, titles in self.saved.items():
+            self.assertLessEqual(set(titles), set(found.get(folder, ())), folder)
         self.assertLessEqual(set(self.saved_templates), {title.path for title in self.user_templates()})
         self.assertEqual(wire.broken_files(self.base), {})
 
@@ -72,6 +80,18 @@ class KilledSession(MortalTitler, LibrarySession):
             shutil.rmtree(self.folder(name), ignore_errors=True)
         self.rows = self.folders()
 
+    def kill_and_look(self, seconds):
+        self.note_saved()
+        self.kill_during(self.play, seconds)
+        self.display.lift_all()
+        self.assert_files_whole()
+        self.start_titler()
+        for name, titles in self.found().items():
+            if titles and name in (FOLDER, COPY, "Welcome"):
+                self.show(name)
+        self.assert_nothing_lost()
+        self.clear()
+
     def test_every_saved_title_is_there_after_a_kill(self):
         rng, seed = self.seeded()
         if "TITLER_SEED" in os.environ:
@@ -83,19 +103,12 @@ class KilledSession(MortalTitler, LibrarySession):
         length = time.monotonic() - begin
         self.clear()
         for turn in range(KILLS):
-            with self.subTest(turn=turn, seed=seed):
-                self.note_saved()
-                after = rng.uniform(0, length)
-                self.kill_during(self.play, after)
-                self.display.lift_all()
-                print(f"turn {turn}: killed after {after:.1f} of {length:.1f} s in {self.doing}", flush=True)
-                self.assert_nothing_lost()
-                self.start_titler()
-                for name in self.found():
-                    if name in (FOLDER, COPY, "Welcome") and self.found()[name]:
-                        self.show(name)
-                self.assert_nothing_lost()
-                self.clear()
+            try:
+                self.kill_and_look(rng.uniform(0, length))
+            except Exception as error:
+                # A turn begins with what the one before it has left.
+                raise AssertionError(f"turn {turn} of the run with seed {seed}, in {self.doing}") from error
+            print(f"turn {turn}: killed in {self.doing}", flush=True)
 
 
 if __name__ == "__main__":

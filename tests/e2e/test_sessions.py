@@ -62,6 +62,7 @@ class Requests(harness.TitlerTest):
         self.command("register")
         self.command("sub")
         self.wait_shown()
+        self.wait_picker()
         self.choose_folder("Welcome")
         first = self.titles(self.folder())[0]
         self.assert_canvas_shows(first, mean=1.0, visible=0.01)
