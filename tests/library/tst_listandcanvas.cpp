@@ -1,4 +1,5 @@
 // The list, the canvas and the pictures together, wired as the window wires them.
+#include "HoldingReporter.h"
 #include "LibraryFixture.h"
 
 #include "canvas/CanvasScene.h"
@@ -22,6 +23,7 @@ private slots:
     void newTitleShowsItsPictureAtOnce();
     void leavingANewTitleWritesItsPictures();
     void deletedTitleLeavesTheCanvas();
+    void deletedTitleLeavesNoPictures();
     void picturesShowWhatTheCanvasShows();
 
 private:
@@ -135,6 +137,26 @@ void tst_ListAndCanvas::deletedTitleLeavesTheCanvas()
     QVERIFY(QDir(folder).entryList({QStringLiteral("*.xml")}, QDir::Files).isEmpty());
     mStack->redo();
     QCOMPARE(mScene->getTextItemList().size(), 1);
+}
+
+void tst_ListAndCanvas::deletedTitleLeavesNoPictures()
+{
+    HoldingReporter reporter;
+    const QString folder = mFixture.makeFolder(QStringLiteral("trace"));
+    mList->refreshArchiveList(folder);
+    createTitle(QStringLiteral("Kept"));
+    const QString kept = canvasTitle();
+    createTitle(QStringLiteral("Gone"));
+    QVERIFY(reporter.reached.tryAcquire(1, 20000)); // the thread is busy with the first one
+    const QString gone = canvasTitle();
+    QVERIFY(gone != kept);
+    mStack->undo();
+    mList->synchronizationFolderFile();
+    reporter.goOn.release(2);
+    QTRY_VERIFY_WITH_TIMEOUT(mScene->isEditFinish(), 20000);
+    QCOMPARE(QDir(folder).entryList({gone + QLatin1Char('*')}, QDir::Files), QStringList());
+    for (const char* suffix : {".xml", "_1920.png", "_960.png", "_240.png", "_240S.png"})
+        QVERIFY(QFile::exists(folder + QLatin1Char('/') + kept + QLatin1String(suffix)));
 }
 
 void tst_ListAndCanvas::picturesShowWhatTheCanvasShows()
