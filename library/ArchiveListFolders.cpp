@@ -1,4 +1,5 @@
 // How the title list opens folders: on request, for one file, and after a folder was renamed.
+#include "canvas/CanvasScene.h"
 #include "document/Archive.h"
 #include "document/ArchiveController.h"
 #include "library/ArchiveItem.h"
@@ -92,6 +93,8 @@ void ArchiveList::refreshArchiveListForChangeFolderName(QString before, QString 
         return;
     endInitThread();
     mController->setLastFolderPath(after);
+    if (mMainScene)
+        mMainScene->folderRenamed(before, after);
     const int selected = getItemIndex(mSelectedItem);
     setDefaultItemState(mSelectedItem);
     mCurrentPath = after;
