@@ -9,6 +9,7 @@
 #include "document/CanvasController.h"
 #include "document/TText.h"
 
+#include <QDir>
 #include <QFileInfo>
 #include <QPainter>
 #include <QPixmap>
@@ -96,7 +97,7 @@ void CanvasScene::generateThumbnail(QSize size, const QString& path)
 void CanvasScene::folderRenamed(const QString& before, const QString& after)
 {
     const QFileInfo title(m_archive ? QString::fromStdString(m_archive->getPath()) : QString());
-    if (title.path() != before)
+    if (!m_archive || QDir::cleanPath(title.path()) != QDir::cleanPath(before))
         return;
     m_archive->setPath((after + QLatin1Char('/') + title.fileName()).toStdString());
     if (itemIsEditorInteraction())

@@ -9,6 +9,8 @@
 #include "library/ListMessages.h"
 #include "support/LogManager.h"
 
+#include <QDir>
+
 namespace
 {
 
@@ -89,7 +91,7 @@ void ArchiveList::refreshArchiveListForChangeFolderName(QString before, QString 
     LOG_DEBUG_OPERATE(L"ArchiveList", 200,
                       L"ArchiveList_refreshArchiveListForChangeFolderName() Enter Before:" +
                           before.toStdWString() + L" After:" + after.toStdWString());
-    if (before != mCurrentPath)
+    if (QDir::cleanPath(before) != QDir::cleanPath(mCurrentPath)) // a request may end with a "/"
         return;
     endInitThread();
     mController->setLastFolderPath(after);

@@ -47,6 +47,7 @@ private slots:
     void noticesOfTheFileManager();
     void noticesWhileHidden();
     void renameOfTheFolderThatIsEdited();
+    void renameUnderATextThatIsTyped_data();
     void renameUnderATextThatIsTyped();
     void noTemplateLeadsBackToThePicker();
     void masksLieOnTheDialog();
@@ -309,9 +310,18 @@ void tst_folder_dialog::renameOfTheFolderThatIsEdited()
     QVERIFY(!QFileInfo::exists(path("news")));
 }
 
+void tst_folder_dialog::renameUnderATextThatIsTyped_data()
+{
+    QTest::addColumn<QString>("opened");
+    QTest::newRow("a title") << "/t1.xml";
+    QTest::newRow("a folder") << "";
+    QTest::newRow("a folder with a slash behind it") << "/";
+}
+
 void tst_folder_dialog::renameUnderATextThatIsTyped()
 {
-    request(path("news") + "/t2.xml");
+    QFETCH(QString, opened);
+    request(path("news") + opened);
     auto* scene = mWindow->findChild<CanvasScene*>();
     GraphicsText* item = scene->findTextItem(1);
     item->setTextInteractionFlags(Qt::TextEditorInteraction);
@@ -321,15 +331,15 @@ void tst_folder_dialog::renameUnderATextThatIsTyped()
     EditTitlerController::getInstance()->updateFolderNameInCurrentProjectNotify(
         {1, path("news").toStdWString(), path("later").toStdWString()});
     // What was typed is neither lost nor a step that would go back to the old folder.
-    QCOMPARE(scene->findTextItem(1)->toPlainText(), QStringLiteral("t2快讯"));
+    QCOMPARE(scene->findTextItem(1)->toPlainText(), QStringLiteral("t1快讯"));
     for (QAction* action : mWindow->findChildren<QAction*>(QString(), Qt::FindDirectChildrenOnly))
         QVERIFY(!action->text().startsWith("Undo") || !action->isEnabled());
     mWindow->closeTitlerWindow();
     Archive archive;
-    QVERIFY(ArchiveController().getOneArchive(path("later") + "/t2.xml", &archive));
-    QCOMPARE(QString::fromStdString(archive.text().front()->getText()), QStringLiteral("t2快讯"));
+    QVERIFY(ArchiveController().getOneArchive(path("later") + "/t1.xml", &archive));
+    QCOMPARE(QString::fromStdString(archive.text().front()->getText()), QStringLiteral("t1快讯"));
     for (const char* picture : {"_1920.png", "_960.png", "_240.png", "_240S.png"})
-        QVERIFY2(!QImage(path("later") + "/t2" + picture).isNull(), picture);
+        QVERIFY2(!QImage(path("later") + "/t1" + picture).isNull(), picture);
     QVERIFY(!QFileInfo::exists(path("news")));
 }
 
