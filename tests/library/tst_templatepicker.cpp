@@ -253,6 +253,18 @@ private slots:
         QCOMPARE(selected[0][0].value<Archive*>(), users()->archive(1));
     }
 
+    void theLastChoiceIsTold()
+    {
+        mFixture.makeUserTemplate("UserTemplate_001", {"one", "two"});
+        UserTemplatePickerController().saveSelectedTemplate(
+            mFixture.userTitle("UserTemplate_001").toStdString());
+        openUserTab();
+        QCOMPARE(users()->selectedItem(), users()->item(0));
+        QCOMPARE(fileName()->text(), QString("UserTemplate_001"));
+        QCOMPARE(preview()->textLines().mid(0, 2), QStringList({"one", "two"}));
+        QVERIFY(button("deleteTemplateButton")->isEnabled());
+    }
+
     void deleteAsksAndDeletes()
     {
         mFixture.makeUserTemplates(5);
