@@ -127,6 +127,9 @@ bool CanvasScene::archiveIsNull(const Archive* archive)
 void CanvasScene::slotUpdateArchive(const Archive* archive)
 {
     savePreviousArchiveInfo();
+    // A text that was being typed until now is in no picture yet.
+    if (m_archive && (!archive || archive->getPath() != m_archive->getPath()))
+        slotMakeSceneThumnail();
     if (archiveIsNull(archive))
         return;
     if (archive != m_archive.get())

@@ -75,6 +75,7 @@ private:
     void typeText(int id, const QString& text);
     void dragObject();
     void carryTitle();
+    void tapTitle(int row);
     void choose(ArchiveAction::ARCHIVE_ACTION_TYPE type, int row);
     void finger(QEventPoint::State state, const QWidget* widget, const QPoint& place);
     QAction* undoAction() const;
@@ -257,7 +258,8 @@ void tst_Closing::enter(State state)
         break;
     case PicturesOnTheirWay:
         for (int row = 0; row < list()->count(); ++row) {
-            list()->selectArchive(row);
+            tapTitle(row);
+            QCOMPARE(list()->getItemIndex(list()->getSelectedArchive()), row);
             const QString stem = mOrder.at(row);
             typeText(1, QStringLiteral("+"));
             mTexts[stem][1] += QStringLiteral("+");
@@ -353,6 +355,13 @@ void tst_Closing::carryTitle()
     for (int step = 1; step <= 8; ++step)
         finger(QEventPoint::Updated, list(), QPoint(HANDLE_X, 65 + ROW * step / 8));
     mOrder.move(0, 1);
+}
+
+void tst_Closing::tapTitle(int row)
+{
+    const QPoint place(PICTURE_X, row * ROW + 60);
+    finger(QEventPoint::Pressed, list(), place);
+    finger(QEventPoint::Released, list(), place);
 }
 
 void tst_Closing::choose(ArchiveAction::ARCHIVE_ACTION_TYPE type, int row)

@@ -3,6 +3,7 @@
 #include "LibraryFixture.h"
 
 #include "canvas/CanvasScene.h"
+#include "canvas/GraphicsText.h"
 #include "library/ArchiveItem.h"
 #include "library/ArchiveList.h"
 #include "library/ThumbnailRender.h"
@@ -10,6 +11,7 @@
 #include <QLabel>
 #include <QPainter>
 #include <QTest>
+#include <QTextCursor>
 #include <QUndoStack>
 
 class tst_ListAndCanvas : public QObject
@@ -22,6 +24,7 @@ private slots:
     void selectedTitleIsOnTheCanvas();
     void newTitleShowsItsPictureAtOnce();
     void leavingANewTitleWritesItsPictures();
+    void leavingATextThatIsTypedWritesItsPictures();
     void deletedTitleLeavesTheCanvas();
     void deletedTitleLeavesNoPictures();
     void picturesShowWhatTheCanvasShows();
@@ -123,6 +126,27 @@ void tst_ListAndCanvas::leavingANewTitleWritesItsPictures()
     QTRY_VERIFY_WITH_TIMEOUT(mScene->isEditFinish(), 20000);
     for (const char* suffix : {"_1920.png", "_960.png", "_240.png", "_240S.png"})
         QVERIFY(!QImage(folder + QLatin1Char('/') + stem + QLatin1String(suffix)).isNull());
+}
+
+void tst_ListAndCanvas::leavingATextThatIsTypedWritesItsPictures()
+{
+    const QString folder = mFixture.makeFolder(QStringLiteral("typed"));
+    LibraryFixture::fillFolder(folder, {QStringLiteral("a"), QStringLiteral("b")});
+    mList->refreshArchiveList(folder);
+    connect(mScene.get(), &CanvasScene::signalPushUndoCommandIntoStack, mStack.get(), &QUndoStack::push);
+    GraphicsText* text = mScene->findTextItem(1);
+    text->setTextInteractionFlags(Qt::TextEditorInteraction);
+    text->textCursor().insertText(QStringLiteral("longer than before "));
+    QTest::mouseClick(mList->archiveItem(1), Qt::LeftButton, Qt::NoModifier, QPoint(20, 20));
+    QCOMPARE(canvasTitle(), QStringLiteral("b"));
+    QVERIFY(!mScene->isEditFinish());
+    QTRY_VERIFY_WITH_TIMEOUT(mScene->isEditFinish(), 20000);
+    const QRect ink = inkIn(QImage(folder + QStringLiteral("/a_1920.png")));
+    QVERIFY(ink.width() > 200);
+    // The other was only looked at.
+    mList->selectArchive(0);
+    QVERIFY(mScene->isEditFinish());
+    QVERIFY(!QFile::exists(folder + QStringLiteral("/b_1920.png")));
 }
 
 void tst_ListAndCanvas::deletedTitleLeavesTheCanvas()
