@@ -63,14 +63,19 @@ private slots:
     void cleanup();
     void everyStateByEveryEnding_data();
     void everyStateByEveryEnding();
+    void folderGone_data();
+    void folderGone();
 
 private:
     static bool isUnderTheFinger(State state)
     {
         return state == TextTyped || state == ObjectDragged || state == TitleCarried || state == MenuOpen;
     }
+    void begin(Ending ending);
     void enter(State state);
     void end(Ending ending);
+    void verifyAnswer(Ending ending);
+    void verifyDisk();
 
     void typeText(int id, const QString& text);
     void dragObject();
@@ -97,6 +102,7 @@ private:
     std::unique_ptr<TitlerWindow> mWindow;
     QString mFolder;
     Answers mAnswers;
+    QStringList mMade; // file names, in the order of making
     // What must be on disk at the end.
     QStringList mOrder;
     QMap<QString, Texts> mTexts;
@@ -125,6 +131,7 @@ void tst_Closing::init()
     mTexts.clear();
     for (const QString& stem : mOrder)
         mTexts[stem] = {{1, stem}};
+    mMade.clear();
     mChanged.clear();
     mDraggedTo = {};
     mAnswers = {};
@@ -158,6 +165,51 @@ void tst_Closing::everyStateByEveryEnding()
 {
     QFETCH(State, state);
     QFETCH(Ending, ending);
+    begin(ending);
+    enter(state);
+    if (QTest::currentTestFailed())
+        return;
+    if (state != TitleCarried)
+        mOrder = stems();
+    end(ending);
+    verifyAnswer(ending);
+    if (ending == PowerOff || ending == Signal) // what was deleted goes with the next Close of the folder
+        ArchiveController().deleteUnusefulArchives(mFolder);
+    verifyDisk();
+}
+
+void tst_Closing::folderGone_data()
+{
+    QTest::addColumn<State>("state");
+    QTest::addColumn<Ending>("ending");
+    const QMetaEnum endings = QMetaEnum::fromType<Ending>();
+    for (int ending = 0; ending < endings.keyCount(); ++ending) {
+        for (const State state : {TextTyped, TitleCarried})
+            QTest::addRow("%s, %d", endings.key(ending), state)
+                << state << static_cast<Ending>(endings.value(ending));
+    }
+}
+
+void tst_Closing::folderGone()
+{
+    QFETCH(State, state);
+    QFETCH(Ending, ending);
+    begin(ending);
+    enter(state);
+    if (QTest::currentTestFailed())
+        return;
+    QTRY_VERIFY(scene()->isEditFinish()); // or what is being written comes in between
+    QVERIFY(QDir(mFolder).removeRecursively());
+    end(ending);
+    QVERIFY(!mWindow->isVisible());
+    QVERIFY(!QFileInfo::exists(mFolder)); // nor does it come back half
+    QCOMPARE(mAnswers.calls, ending == AnswerOfCreation ? 1 : 0);
+    QCOMPARE(mAnswers.paths, ending == AnswerOfCreation ? mMade : QStringList()); // as they were made
+}
+
+// Opens the folder, and makes two titles in it, the second above the first.
+void tst_Closing::begin(Ending ending)
+{
     mWindow->showTitlerWindow({_titler_paramter::CREATE_OR_EDIT, mFolder.toStdWString()});
     QVERIFY(QTest::qWaitForWindowActive(mWindow.get()));
     QTRY_VERIFY(list()->archiveItem(2) && list()->archiveItem(2)->hasChildWidgets());
@@ -166,35 +218,31 @@ void tst_Closing::everyStateByEveryEnding()
     context->resultCallBack(new RecordingCallBack(mAnswers));
     if (ending == AnswerOfCreation)
         context->showTitlerCreate(3); // the window is open: only the context takes note
-    // In every session a title is made, above the others.
-    list()->selectOperationArchive(0);
     choose(ArchiveAction::ACTION_COPY, 0);
-    choose(ArchiveAction::ACTION_PASTE, 0);
-    QCOMPARE(list()->count(), 4);
+    for (int i = 0; i < 2; ++i) {
+        choose(ArchiveAction::ACTION_PASTE, 0);
+        const QString stem = stems().at(1);
+        mMade.append(stem + ".xml");
+        mTexts[stem] = {{1, "a"}};
+    }
     mOrder = stems();
-    mTexts[mOrder.at(1)] = {{1, "a"}};
+    QCOMPARE(mOrder.size(), 5);
     list()->selectArchive(0);
+}
 
-    enter(state);
-    if (QTest::currentTestFailed())
-        return;
-    mOrder = state == TitleCarried ? mOrder : stems();
-    QStringList made;
-    for (const QString& stem : std::as_const(mOrder)) {
-        if (stem.size() > 1)
-            made.append(stem + ".xml");
-    }
-    end(ending);
-    if (QTest::currentTestFailed())
-        return;
-
+void tst_Closing::verifyAnswer(Ending ending)
+{
     QVERIFY(!mWindow->isVisible());
-    if (ending == AnswerOfCreation) {
-        QCOMPARE(mAnswers.calls, 1);
-        QCOMPARE(mAnswers.paths, made);
-    } else {
+    if (ending != AnswerOfCreation) {
         QCOMPARE(mAnswers.calls, 0);
+        return;
     }
+    QCOMPARE(mAnswers.calls, 1);
+    QCOMPARE(mAnswers.paths, (QStringList{mMade.at(1), mMade.at(0)})); // the order of the folder
+}
+
+void tst_Closing::verifyDisk()
+{
     QCOMPARE(LibraryFixture::order(mFolder), mOrder);
     QSet<QString> known{".order.xml"};
     for (const QString& stem : std::as_const(mOrder)) {
@@ -206,20 +254,16 @@ void tst_Closing::everyStateByEveryEnding()
                 QVERIFY2(!QImage(mFolder + '/' + stem + picture).isNull(), picture);
         }
     }
-    if (ending == PowerOff || ending == Signal) {
-        // What was deleted goes with the next Close of the folder.
-        ArchiveController().deleteUnusefulArchives(mFolder);
-    }
     const QStringList files = QDir(mFolder).entryList(QDir::Files | QDir::Hidden);
     for (const QString& file : files)
         QVERIFY2(known.contains(file), qPrintable(file));
-    if (!mDraggedTo.isNull()) {
-        Archive archive;
-        QVERIFY(ArchiveController().getOneArchive(mFolder + "/a.xml", &archive));
-        const TText* text = archive.text().front();
-        const QPointF saved(text->getXValue(), text->getYValue());
-        QVERIFY((saved - mDraggedTo).manhattanLength() < 0.1);
-    }
+    if (mDraggedTo.isNull())
+        return;
+    Archive archive;
+    QVERIFY(ArchiveController().getOneArchive(mFolder + "/a.xml", &archive));
+    const TText* text = archive.text().front();
+    const QPointF saved(text->getXValue(), text->getYValue());
+    QVERIFY((saved - mDraggedTo).manhattanLength() < 0.1);
 }
 
 void tst_Closing::enter(State state)
@@ -268,13 +312,13 @@ void tst_Closing::enter(State state)
         break;
     case PasteDeletedAtOnce:
         choose(ArchiveAction::ACTION_PASTE, 0);
-        QCOMPARE(list()->count(), 5);
+        QCOMPARE(list()->count(), 6);
         choose(ArchiveAction::ACTION_DELETE, 1);
         QCOMPARE(stems(), mOrder);
         break;
     case DeletedAndUndone:
         choose(ArchiveAction::ACTION_DELETE, 2);
-        QCOMPARE(list()->count(), 3);
+        QCOMPARE(list()->count(), 4);
         undoAction()->trigger();
         QCOMPARE(stems(), mOrder);
         break;

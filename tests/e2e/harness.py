@@ -213,8 +213,15 @@ class TitlerTest(unittest.TestCase):
 
     def titles(self, folder):
         """The title files of a folder in its order."""
-        order = xml.etree.ElementTree.parse(os.path.join(folder, ".order.xml")).getroot()
-        return [Title(os.path.join(folder, row.get("file-path"))) for row in order.iter("index")]
+        def order():
+            """Not while it is being written, which is done in place."""
+            try:
+                return xml.etree.ElementTree.parse(os.path.join(folder, ".order.xml"))
+            except (FileNotFoundError, xml.etree.ElementTree.ParseError):
+                return None
+
+        rows = session.wait_until(order, 5 * SLOW, f"the order of {folder}").getroot().iter("index")
+        return [Title(os.path.join(folder, row.get("file-path"))) for row in rows]
 
     # The window
 
