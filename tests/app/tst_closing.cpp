@@ -65,6 +65,8 @@ private slots:
     void everyStateByEveryEnding();
     void folderGone_data();
     void folderGone();
+    void powerOffOverTheQuestion();
+    void closeOverTheQuestion();
 
 private:
     static bool isUnderTheFinger(State state)
@@ -205,6 +207,33 @@ void tst_Closing::folderGone()
     QVERIFY(!QFileInfo::exists(mFolder)); // nor does it come back half
     QCOMPARE(mAnswers.calls, ending == AnswerOfCreation ? 1 : 0);
     QCOMPARE(mAnswers.paths, ending == AnswerOfCreation ? mMade : QStringList()); // as they were made
+}
+
+void tst_Closing::powerOffOverTheQuestion()
+{
+    begin(CloseAfterQuestion);
+    enter(TextTyped);
+    mWindow->closeTitlerWindow();
+    QVERIFY(mWindow->isVisible());
+    end(PowerOff);
+    verifyAnswer(PowerOff);
+    verifyDisk();
+}
+
+void tst_Closing::closeOverTheQuestion()
+{
+    begin(CloseAfterQuestion);
+    enter(TextTyped);
+    mWindow->closeTitlerWindow();
+    QVERIFY(mWindow->isVisible());
+    mWindow->closeTitlerWindow(); // the question was for once
+    QVERIFY(!mWindow->isVisible());
+    verifyDisk();
+    // The answer comes late and finds nothing to do.
+    mWindow->continueCloseTitler({1, MessageDefine::CLOSE_OK, MessageDef::MESSAGE_CONFIRM_CLOSE});
+    verifyAnswer(CloseAfterQuestion);
+    mWindow->showTitlerWindow({_titler_paramter::CREATE_OR_EDIT, mFolder.toStdWString()});
+    QCOMPARE(stems(), mOrder);
 }
 
 // Opens the folder, and makes two titles in it, the second above the first.
