@@ -7,6 +7,7 @@
 #include "app/SystemSetupInfoController.h"
 #include "app/ToolsBar.h"
 #include "canvas/CanvasScene.h"
+#include "canvas/GraphicsView.h"
 #include "library/ArchiveList.h"
 #include "library/FolderPicker.h"
 #include "library/TemplatePicker.h"
@@ -162,6 +163,7 @@ bool TitlerWindow::dataSaveIsFinished()
 
 void TitlerWindow::saveCurrentTitle()
 {
+    mGraphicsView->endTouch(); // an object that is being dragged stays where it is
     mCanvasScene->clearItemsSelectionAndFocus();
     mCanvasScene->slotMakeSceneThumnail();
 }

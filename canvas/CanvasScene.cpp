@@ -77,7 +77,7 @@ const Archive* CanvasScene::archive() const
     return m_archive.get();
 }
 
-// Showing a title
+// Showing a title; see CanvasSceneSaving.cpp for saving one
 
 void CanvasScene::savePreviousArchiveInfo()
 {
@@ -127,6 +127,9 @@ bool CanvasScene::archiveIsNull(const Archive* archive)
 void CanvasScene::slotUpdateArchive(const Archive* archive)
 {
     savePreviousArchiveInfo();
+    // A text that was being typed until now is in no picture yet.
+    if (m_archive && (!archive || archive->getPath() != m_archive->getPath()))
+        slotMakeSceneThumnail();
     if (archiveIsNull(archive))
         return;
     if (archive != m_archive.get())
@@ -576,86 +579,6 @@ void CanvasScene::focusOutEvent(QFocusEvent* event)
     // The object that is edited keeps the focus while the panel or the keyboard is used.
     if (!itemIsEditorInteraction())
         QGraphicsScene::focusOutEvent(event);
-}
-
-// Saving
-
-void CanvasScene::saveArchive()
-{
-    if (!m_archive || enableItems().isEmpty())
-        return;
-    saveArchiveXML(QString::fromStdString(m_archive->getPath()));
-    if (m_thumbnailRender)
-        m_thumbnailRender->makeThumbnail(m_archive.get(), false);
-    m_contentsChanged = false;
-}
-
-void CanvasScene::saveArchiveXML(const QString& path)
-{
-    // Oldest first, so that the order in the file does not change with the stacking of the moment.
-    std::vector<TText*> records;
-    const QList<GraphicsText*> enabled = m_texts->enabledTexts();
-    for (GraphicsText* item : std::as_const(*m_texts).listed()) {
-        if (!enabled.contains(item))
-            continue;
-        TText* record = item->getTextList();
-        record->setXValue(float(item->scenePos().x()));
-        record->setYValue(float(item->scenePos().y()));
-        record->setZValue(item->getItemTText()->getZValue());
-        records.push_back(record);
-    }
-    if (m_currentPixmapItem) {
-        m_archive->setBgPointX(float(m_currentPixmapItem->x()));
-        m_archive->setBgPointY(float(m_currentPixmapItem->y()));
-        m_archive->setBgPointZ(float(m_currentPixmapItem->zValue()));
-    }
-    m_archive->releaseVectorText();
-    m_archive->setText(records);
-    m_controller->saveArchiveChange(path, m_archive.get());
-}
-
-void CanvasScene::slotSaveArchive(GraphicsText* item)
-{
-    saveArchive();
-    m_thumbnailNeeded = true;
-    if (item)
-        item->update();
-}
-
-void CanvasScene::slotMakeSceneThumnail()
-{
-    const bool needed =
-        m_archive && m_thumbnailNeeded && QFileInfo::exists(QString::fromStdString(m_archive->getPath()));
-    if (needed && m_thumbnailRender)
-        m_thumbnailRender->makeThumbnail(m_archive.get(), true);
-    m_thumbnailNeeded = false;
-}
-
-void CanvasScene::createThumnailPicture()
-{
-    if (!m_archive)
-        return;
-    if (m_thumbnailRender)
-        m_thumbnailRender->makeThumbnail(m_archive.get(), false);
-    m_thumbnailNeeded = true;
-}
-
-bool CanvasScene::isEditFinish() const
-{
-    return !m_thumbnailRender || m_thumbnailRender->makePictureThreadIsFinished();
-}
-
-void CanvasScene::generateThumbnail(QSize size, const QString& path)
-{
-    QPixmap picture(size);
-    if (picture.isNull())
-        return;
-    picture.fill(Qt::transparent);
-    QPainter painter(&picture);
-    painter.setRenderHint(QPainter::Antialiasing);
-    render(&painter);
-    painter.end();
-    picture.save(path);
 }
 
 // Background and safe area

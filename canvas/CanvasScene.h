@@ -102,6 +102,9 @@ public:
     void generateThumbnail(QSize size, const QString& path);
     // The copy of the title shown, or null; owned by the scene.
     const Archive* archive() const;
+    // The folder of the title shown, if this is its path, lies elsewhere now: what is being typed is taken
+    // over, and all that is saved goes there.
+    void folderRenamed(const QString& before, const QString& after);
 
 public Q_SLOTS:
     void addCGraphicsTextItem();

@@ -2,6 +2,7 @@
 
 #include <QApplication>
 #include <QMouseEvent>
+#include <QPointingDevice>
 #include <QTouchEvent>
 
 namespace
@@ -28,6 +29,15 @@ GraphicsView::GraphicsView(QGraphicsScene* scene, QWidget* parent) : QGraphicsVi
 void GraphicsView::mouseClick()
 {
     m_clickTimer.stop();
+}
+
+void GraphicsView::endTouch()
+{
+    if (m_touchPoints.isEmpty())
+        return;
+    // By way of the application, whose gate lets other fingers in then.
+    QTouchEvent cancel(QEvent::TouchCancel, QPointingDevice::primaryPointingDevice());
+    QApplication::sendEvent(viewport(), &cancel);
 }
 
 void GraphicsView::getTouchPoints(QEvent* event)

@@ -15,6 +15,9 @@ class GraphicsView : public QGraphicsView
 public:
     explicit GraphicsView(QGraphicsScene* scene, QWidget* parent = nullptr);
 
+    // Ends the touch that goes on, if there is one, as if the finger had been lifted where it is.
+    void endTouch();
+
 Q_SIGNALS:
     // A finger was lifted; sent before the release reaches the scene.
     void deleteEmptyItem();

@@ -29,6 +29,17 @@ std::string fileNameOf(const std::string& path)
     return slash == std::string::npos ? path : path.substr(slash + 1);
 }
 
+// Whether this can be a picture beside its title. A preset's background lies elsewhere, and a title file of
+// foreign making must not choose what else is removed: an empty name stands for the folder itself, and others
+// for titles or for files of other folders.
+bool isPictureName(const std::string& name)
+{
+    return !name.empty() && name.find('/') == std::string::npos &&
+           QFileInfo(QString::fromStdString(name))
+                   .suffix()
+                   .compare(QLatin1String("xml"), Qt::CaseInsensitive) != 0;
+}
+
 template <typename T>
 std::vector<std::unique_ptr<T>> own(const std::vector<T*>& records)
 {
@@ -144,11 +155,13 @@ int ArchiveManager::deleteArchive(std::string path)
         return 0;
     const bool isRemoved = std::remove(path.c_str()) == 0;
     const std::string folder = path.substr(0, path.rfind('/') + 1);
-    // Most titles lack some of these, and a preset's absolute background does not exist below its folder.
+    // Most titles lack some of these.
     for (const std::string& name :
          {archive.getThumbnailBig(), archive.getThumbnailSmall(), archive.getThumbnailMiddle(),
-          archive.getThumbnailBlack(), archive.getBgResource(), archive.getBgResourceBig()})
-        std::remove((folder + name).c_str());
+          archive.getThumbnailBlack(), archive.getBgResource(), archive.getBgResourceBig()}) {
+        if (isPictureName(name))
+            std::remove((folder + name).c_str());
+    }
     return isRemoved ? 1 : 0;
 }
 

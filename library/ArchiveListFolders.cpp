@@ -1,4 +1,5 @@
 // How the title list opens folders: on request, for one file, and after a folder was renamed.
+#include "canvas/CanvasScene.h"
 #include "document/Archive.h"
 #include "document/ArchiveController.h"
 #include "library/ArchiveItem.h"
@@ -7,6 +8,8 @@
 #include "library/ITitlerFolderReporter.h"
 #include "library/ListMessages.h"
 #include "support/LogManager.h"
+
+#include <QDir>
 
 namespace
 {
@@ -88,10 +91,12 @@ void ArchiveList::refreshArchiveListForChangeFolderName(QString before, QString 
     LOG_DEBUG_OPERATE(L"ArchiveList", 200,
                       L"ArchiveList_refreshArchiveListForChangeFolderName() Enter Before:" +
                           before.toStdWString() + L" After:" + after.toStdWString());
-    if (before != mCurrentPath)
+    if (QDir::cleanPath(before) != QDir::cleanPath(mCurrentPath)) // a request may end with a "/"
         return;
     endInitThread();
     mController->setLastFolderPath(after);
+    if (mMainScene)
+        mMainScene->folderRenamed(before, after);
     const int selected = getItemIndex(mSelectedItem);
     setDefaultItemState(mSelectedItem);
     mCurrentPath = after;

@@ -20,6 +20,7 @@
 #include <QWheelEvent>
 #include <string>
 #include <unistd.h>
+#include <utility>
 
 namespace
 {
@@ -289,8 +290,8 @@ void ArchiveList::setSystemLanFont(QString family)
     mMenuFont = QFont(family);
     mMenuFont.setPixelSize(MENU_FONT_SIZE);
     ArchiveItem::setSystemFontFamily(family);
-    for (int i = 0; i < count(); ++i)
-        archiveItem(i)->updateRightChild();
+    for (ArchiveItem* item : std::as_const(mAllItems)) // also those that may come back
+        item->updateRightChild();
 }
 
 void ArchiveList::translateText()

@@ -3,6 +3,8 @@
 #include "library/FolderPicker.h"
 
 #include "canvas/MessageBoxController.h"
+#include "document/Archive.h"
+#include "document/ArchiveController.h"
 #include "library/FolderEditor.h"
 #include "library/FolderNameRules.h"
 #include "library/FolderPickerFactory.h"
@@ -268,6 +270,12 @@ void FolderPicker::initThumbnailArea(const QString& path)
 
 void FolderPicker::updateThumbnailArea(const QString& path)
 {
+    // A title with a background of its own has a small picture of that one's kind.
+    Archive archive;
+    if (ArchiveController().getOneArchive(path, &archive) && !archive.getThumbnailSmall().empty()) {
+        initThumbnailArea(archive.getFullPathOfThumbnailSmall());
+        return;
+    }
     const std::string title = path.toStdString();
     const std::string name = TitlerUtility::getThumbnailNameFromTitlePath(
         title, TitleFileOperations::THUMBNAIL_SMALL.toStdString());

@@ -59,9 +59,9 @@ void FolderPicker::folderNameChanged(FileManagerDefine::tagChangeFolderNameParam
     regetRootPath();
     if (!mCurrentFolderName.isEmpty() && FolderNameRules::isSameName(before, mCurrentFolderName)) {
         mCurrentFolderName = after;
-        // The steps back speak of the old path.
-        emit clearUndoCommandStack();
         emit folderNameChange(folderPath(before), folderPath(after));
+        // The steps back speak of the old path, also that of a text that was just being typed.
+        emit clearUndoCommandStack();
     }
     if (!isVisible())
         return;

@@ -6,6 +6,7 @@
 #include "document/PngWriter.h"
 #include "library/TitlerUtility.h"
 
+#include <QFile>
 #include <QMutexLocker>
 #include <future>
 #include <string>
@@ -48,7 +49,7 @@ void PictureThread::addArchive(const Archive* archive, QList<QImage> images)
 {
     if (!archive || images.size() < 2)
         return;
-    Job job{std::make_unique<Archive>(*archive), images.at(0), images.at(1)};
+    Job job{std::make_unique<Archive>(*archive), images.at(0), images.at(1), hasTitle(*archive)};
     QMutexLocker lock(&mMutex);
     ++mUnfinished;
     mJobs.push_back(std::move(job));
@@ -74,8 +75,25 @@ void PictureThread::run()
             mJobs.pop_front();
         }
         saveArchiveThumnail(*job.archive, job.big, job.middle);
+        // The clean-up takes the title file first: what it found there it removes after this.
+        if (job.hadTitle && !hasTitle(*job.archive))
+            removePictures(*job.archive);
         job = Job(); // the images go before the job counts as finished
         --mUnfinished;
+    }
+}
+
+bool PictureThread::hasTitle(const Archive& archive)
+{
+    return QFile::exists(QString::fromStdString(archive.getPath()));
+}
+
+void PictureThread::removePictures(const Archive& archive)
+{
+    for (const std::string& name : {archive.getThumbnailBig(), archive.getThumbnailMiddle(),
+                                    archive.getThumbnailBlack(), archive.getThumbnailSmall()}) {
+        if (const QString path = picturePath(archive, name); !path.isEmpty())
+            QFile::remove(path);
     }
 }
 

@@ -26,7 +26,8 @@ public:
     ~PictureThread() override;
 
     // Queues one job; keeps a copy of the record. The first image is the 1920x1080 picture, the second the
-    // 960x540 one. A null record or fewer images do nothing. GUI thread; never waits for a picture.
+    // 960x540 one. A null record or fewer images do nothing. A title that is deleted before its pictures are
+    // in place keeps none of them. GUI thread; never waits for a picture.
     void addArchive(const Archive* archive, QList<QImage> images);
 
     // True when no job is queued or being written. From the moment a job is queued this is false until its
@@ -41,9 +42,12 @@ private:
         std::unique_ptr<Archive> archive;
         QImage big;
         QImage middle;
+        bool hadTitle = false; // whether there was a title file when the job was queued
     };
 
     void saveArchiveThumnail(const Archive& archive, const QImage& big, const QImage& middle);
+    static bool hasTitle(const Archive& archive);
+    static void removePictures(const Archive& archive);
 
     QMutex mMutex; // guards the queue and the stop flag
     QWaitCondition mCondition;

@@ -202,6 +202,7 @@ void TemplatePicker::showEvent(QShowEvent* event)
         mPresetTab->mapFrom(mTabs, QPoint(0, PANE_TOP + SCROLL_AREA_HIGHT + 2 * PAIN_LINE)).y();
     mDeleteButton2->move(place.x() + (width - TOOLBARBTN_SIZE.width()) / 2,
                          bottom - TOOLBARBTN_SIZE.height());
+    updateUserTemplateArea(); // the name is cut to the room that it has
 }
 
 void TemplatePicker::updateFilenameArea(const QString& name)

@@ -2,6 +2,7 @@
 
 #include "touchui/FlickMotion.h"
 #include "touchui/KSScrollBar.h"
+#include "touchui/TouchEventButton.h"
 
 #include <QApplication>
 #include <QMouseEvent>
@@ -78,6 +79,12 @@ void TemplateScrollArea::forgetTouch()
     mTouchId = -1;
     mTouchedObject.clear();
     mPressedButton.clear();
+}
+
+void TemplateScrollArea::letGoOf(TouchEventButton* button)
+{
+    if (mTouchedObject == button)
+        button->breakTouch(); // comes by as a cancelled touch
 }
 
 bool TemplateScrollArea::event(QEvent* event)

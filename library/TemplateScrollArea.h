@@ -11,6 +11,7 @@
 
 class QPushButton;
 class QTouchEvent;
+class TouchEventButton;
 
 class TemplateScrollArea : public QScrollArea
 {
@@ -28,6 +29,8 @@ public:
     void stopFlick();
     // Whether the finger and the point that follows it are as near as they get.
     bool isFlickEnd() const;
+    // For a button that is taken out of the grid: a finger on it gets no further.
+    void letGoOf(TouchEventButton* button);
 
 signals:
     // A tap on a button; not after a drag.

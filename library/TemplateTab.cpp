@@ -57,6 +57,8 @@ void TemplateTab::setTemplates(const QVector<Archive*>& templates)
 void TemplateTab::clear()
 {
     mSelected = nullptr;
+    for (TemplateItem* item : mItems)
+        mScrollArea->letGoOf(item);
     qDeleteAll(mItems);
     mItems.clear();
     mArchives.clear();
@@ -94,6 +96,7 @@ void TemplateTab::removeTemplate(int id)
     const bool wasSelected = removed == mSelected;
     if (wasSelected)
         mSelected = nullptr;
+    mScrollArea->letGoOf(removed);
     mGrid->removeWidget(removed);
     mItems.removeAt(id);
     // The call may come from within the item's own event.

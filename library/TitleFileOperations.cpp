@@ -58,6 +58,13 @@ QString extensionOf(const std::string& fileName)
     return dot < 0 || dot < name.lastIndexOf(QLatin1Char('/')) ? QString() : name.mid(dot);
 }
 
+// A background that gets names of its own with each copy. Without them it would be copied over files that may
+// be another title's.
+bool hasOwnBackground(const Archive& archive)
+{
+    return !archive.isPreset() && !extensionOf(archive.getThumbnailSmall()).isEmpty();
+}
+
 } // namespace
 
 TitleFileOperations::TitleFileOperations(ArchiveController& controller) : mController(controller)
@@ -108,7 +115,7 @@ std::unique_ptr<Archive> TitleFileOperations::createFromTemplate(const QString& 
     renameRecord(*archive, folder);
     Archive from(source);
     mController.copyArchiveThumbnail(&from, archive.get());
-    if (!archive->isPreset())
+    if (hasOwnBackground(source))
         mController.copyArchiveBg(&from, archive.get());
     if (!mController.saveNewArchive(folder, archive.get()))
         return nullptr;
@@ -136,7 +143,7 @@ std::unique_ptr<Archive> TitleFileOperations::createFromCopy(const QString& fold
     writePicture(*archive, archive->getThumbnailSmall(), pictures.small);
     writePicture(*archive, archive->getThumbnailMiddle(), pictures.middle);
     writePicture(*archive, archive->getThumbnailBlack(), pictures.black);
-    if (!archive->isPreset()) {
+    if (hasOwnBackground(copy)) {
         Archive from(copy);
         mController.copyArchiveBg(&from, archive.get());
     }

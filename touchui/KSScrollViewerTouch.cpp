@@ -147,6 +147,17 @@ void KSScrollViewerWidget::cancelTouch()
     handleDropItemWhenRelease();
 }
 
+// For an item that has left the list: the finger that is on it gets no further, and others may come.
+void KSScrollViewerWidget::breakTouchOf(KSBaseItemWidget* item)
+{
+    if (m_press.object != item)
+        return;
+    m_press.object.clear();
+    m_flick.letGo();
+    stopFlick();
+    item->breakTouch();
+}
+
 void KSScrollViewerWidget::hideEvent(QHideEvent* event)
 {
     cancelTouch();

@@ -222,6 +222,7 @@ void KSScrollViewerWidget::removeWidgetItem(KSBaseItemWidget* item)
     if (item && m_drag->item() == item) {
         abandonDrag();
         disconnectItem(item);
+        breakTouchOf(item);
         adjustLayout();
         return;
     }
@@ -247,6 +248,7 @@ void KSScrollViewerWidget::removeWidgetItems(int index, int count)
             m_press.stopTimers();
             m_press.drop();
         }
+        breakTouchOf(item);
     }
     adjustLayout();
 }
@@ -261,6 +263,7 @@ void KSScrollViewerWidget::removeAll()
     if (KSBaseItemWidget* lifted = m_drag->item()) {
         abandonDrag();
         disconnectItem(lifted);
+        breakTouchOf(lifted);
     }
     if (isEmpty())
         adjustLayout();

@@ -210,6 +210,7 @@ private:
     void handleFlickBeginEvent(QObject* object, const QPoint& pos);
     bool isOtherItemTouchWhenGraping(QObject* object, QEvent* event) const;
     void cancelTouch();
+    void breakTouchOf(KSBaseItemWidget* item);
 
     // Press
     void beginPress(int touchId, const QPoint& pos, Qt::MouseButton button);

@@ -2,8 +2,10 @@
 
 #include "support/LogManager.h"
 
+#include <QCoreApplication>
 #include <QEventPoint>
 #include <QMouseEvent>
+#include <QPointingDevice>
 #include <QTouchEvent>
 
 TouchEventButton::TouchEventButton(QWidget* parent) : QPushButton(parent)
@@ -127,6 +129,12 @@ void TouchEventButton::touchCancelEvent()
                      Qt::NoModifier);
     mouseMoveEvent(&move);
     sendRelease(outside, mapToGlobal(outside));
+}
+
+void TouchEventButton::breakTouch()
+{
+    QTouchEvent cancel(QEvent::TouchCancel, QPointingDevice::primaryPointingDevice());
+    QCoreApplication::sendEvent(this, &cancel);
 }
 
 void TouchEventButton::sendRelease(const QPoint& position, const QPoint& screenPosition)

@@ -26,6 +26,10 @@ public:
     void setTouchRect(const QRect& rect) { m_touchRect = rect; }
     QRect touchRect() const { return m_touchRect; }
 
+    // Ends the touch that is on it, without a click, and frees the touch lock that goes with it: for a button
+    // that is taken away from under the finger and will not see it lifted.
+    void breakTouch();
+
 Q_SIGNALS:
     // outside: the finger slid off the button; false: it was lifted on it.
     void signalReleased(bool outside);

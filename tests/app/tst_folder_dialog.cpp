@@ -8,6 +8,7 @@
 #include "app/TitlerWindow.h"
 #include "app/ToolsBar.h"
 #include "canvas/CanvasScene.h"
+#include "canvas/GraphicsText.h"
 #include "library/ArchiveList.h"
 #include "library/FolderPicker.h"
 #include "library/TemplatePicker.h"
@@ -17,10 +18,12 @@
 #include "touchui/KSTreeModel.h"
 #include "touchui/KSTreeView.h"
 
+#include <QAction>
 #include <QApplication>
 #include <QLabel>
 #include <QSignalSpy>
 #include <QTest>
+#include <QTextCursor>
 #include <QTimer>
 #include <functional>
 
@@ -44,6 +47,8 @@ private slots:
     void noticesOfTheFileManager();
     void noticesWhileHidden();
     void renameOfTheFolderThatIsEdited();
+    void renameUnderATextThatIsTyped_data();
+    void renameUnderATextThatIsTyped();
     void noTemplateLeadsBackToThePicker();
     void masksLieOnTheDialog();
     void languageAndFont();
@@ -302,6 +307,39 @@ void tst_folder_dialog::renameOfTheFolderThatIsEdited()
     const auto* scene = mWindow->findChild<CanvasScene*>();
     QCOMPARE(QString::fromStdString(scene->archive()->getPath()), path("later") + "/t2.xml");
     QCOMPARE(picker()->currentFolderName(), QStringLiteral("later"));
+    QVERIFY(!QFileInfo::exists(path("news")));
+}
+
+void tst_folder_dialog::renameUnderATextThatIsTyped_data()
+{
+    QTest::addColumn<QString>("opened");
+    QTest::newRow("a title") << "/t1.xml";
+    QTest::newRow("a folder") << "";
+    QTest::newRow("a folder with a slash behind it") << "/";
+}
+
+void tst_folder_dialog::renameUnderATextThatIsTyped()
+{
+    QFETCH(QString, opened);
+    request(path("news") + opened);
+    auto* scene = mWindow->findChild<CanvasScene*>();
+    GraphicsText* item = scene->findTextItem(1);
+    item->setTextInteractionFlags(Qt::TextEditorInteraction);
+    item->textCursor().insertText(QStringLiteral("快讯"));
+    QVERIFY(scene->itemIsEditorInteraction());
+    QVERIFY(QDir(mFiles.titleRoot()).rename("news", "later"));
+    EditTitlerController::getInstance()->updateFolderNameInCurrentProjectNotify(
+        {1, path("news").toStdWString(), path("later").toStdWString()});
+    // What was typed is neither lost nor a step that would go back to the old folder.
+    QCOMPARE(scene->findTextItem(1)->toPlainText(), QStringLiteral("t1快讯"));
+    for (QAction* action : mWindow->findChildren<QAction*>(QString(), Qt::FindDirectChildrenOnly))
+        QVERIFY(!action->text().startsWith("Undo") || !action->isEnabled());
+    mWindow->closeTitlerWindow();
+    Archive archive;
+    QVERIFY(ArchiveController().getOneArchive(path("later") + "/t1.xml", &archive));
+    QCOMPARE(QString::fromStdString(archive.text().front()->getText()), QStringLiteral("t1快讯"));
+    for (const char* picture : {"_1920.png", "_960.png", "_240.png", "_240S.png"})
+        QVERIFY2(!QImage(path("later") + "/t1" + picture).isNull(), picture);
     QVERIFY(!QFileInfo::exists(path("news")));
 }
 

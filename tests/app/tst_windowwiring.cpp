@@ -20,6 +20,8 @@
 #include "panel/TextToolsPanel.h"
 #include "touchui/KSPushbutton.h"
 
+#include <QMap>
+#include <QMetaMethod>
 #include <QTest>
 
 class tst_WindowWiring : public QObject
@@ -36,11 +38,14 @@ private slots:
     void list();
     void dialogs();
     void controllers();
+    void thereAreNoOthers();
 
 private:
     template <typename Sender, typename Signal, typename Receiver, typename Slot>
     void row(const char* name, const Sender* sender, Signal signal, const Receiver* receiver, Slot slot);
     void noRowIsMissing();
+    // Signals of the object's own class with more or fewer receivers than there are rows for them.
+    QStringList strangeSignals(const QObject* sender) const;
 
     Siblings mSiblings;
     TitlerWindow* mWindow = nullptr;
@@ -51,13 +56,35 @@ private:
     FolderPicker* mFolders = nullptr;
     TemplatePicker* mTemplates = nullptr;
     QStringList mMissing;
+    QMap<QPair<const QObject*, QByteArray>, int> mRows; // by signal
 };
+
+namespace
+{
+
+// What a class does with its own signals is no business of the window.
+const QStringList INTERNAL{"ToolsBar::exeUndoAction",           "ToolsBar::exeRedoAction",
+                           "ToolsBar::menuTriggered",           "TextToolsPanel::sendTitlerWindowRect",
+                           "ArchiveList::signalStartMove",      "ArchiveList::signalItemsCanDrag",
+                           "ArchiveList::signalAddArchiveData", "ArchiveList::signalAddOneArchiveData"};
+
+// How many receivers a signal has, which only the sender itself may ask.
+struct Receivers : QObject {
+    static int count(const QObject* sender, const QMetaMethod& signal)
+    {
+        const QByteArray code = '2' + signal.methodSignature();
+        return (sender->*(&Receivers::receivers))(code.constData());
+    }
+};
+
+} // namespace
 
 // A connection that exists cannot be made a second time as a unique one.
 template <typename Sender, typename Signal, typename Receiver, typename Slot>
 void tst_WindowWiring::row(const char* name, const Sender* sender, Signal signal, const Receiver* receiver,
                            Slot slot)
 {
+    ++mRows[{sender, QMetaMethod::fromSignal(signal).methodSignature()}];
     if (const auto made = connect(sender, signal, receiver, slot, Qt::UniqueConnection)) {
         disconnect(made);
         mMissing.append(QLatin1String(name));
@@ -257,6 +284,46 @@ void tst_WindowWiring::controllers()
     ROW(files, EditTitlerController::deleteUserTemplate, mTemplates, TemplatePicker::slotDeleteUserTemplate);
     ROW(files, EditTitlerController::renameUserTemplate, mTemplates, TemplatePicker::slotRenameUserTemplate);
     noRowIsMissing();
+}
+
+QStringList tst_WindowWiring::strangeSignals(const QObject* sender) const
+{
+    QStringList strange;
+    const QMetaObject* type = sender->metaObject();
+    for (int i = type->methodOffset(); i < type->methodCount(); ++i) {
+        const QMetaMethod method = type->method(i);
+        const QString name = QLatin1String(type->className()) + "::" + QLatin1String(method.name());
+        if (method.methodType() != QMetaMethod::Signal || INTERNAL.contains(name))
+            continue;
+        const int wanted = mRows.value({sender, method.methodSignature()});
+        const int made = Receivers::count(sender, method);
+        if (made != wanted)
+            strange.append(QStringLiteral("%1: %2 instead of %3").arg(name).arg(made).arg(wanted));
+    }
+    return strange;
+}
+
+void tst_WindowWiring::thereAreNoOthers()
+{
+    mRows.clear();
+    toolsBar();
+    canvas();
+    panel();
+    list();
+    dialogs();
+    controllers();
+    QStringList strange;
+    for (const QObject* sender : std::initializer_list<const QObject*>{
+             mWindow, mToolsBar, mScene, mPanel, mList, mFolders, mTemplates,
+             ShowTitlerController::getInstance(), EditContextController::getInstance(),
+             SystemSetupInfoController::getInstance(), TitlerPowerController::getInstance(),
+             ShowMessageController::getInstance(), EditTitlerController::getInstance()})
+        strange.append(strangeSignals(sender));
+    QVERIFY2(strange.isEmpty(), qPrintable(strange.join(QLatin1Char('\n'))));
+    // A row that is made twice is seen, too.
+    connect(mToolsBar, &ToolsBar::closeButtonClick, mWindow, &TitlerWindow::clearUndoStack);
+    QCOMPARE(strangeSignals(mToolsBar), QStringList{"ToolsBar::closeButtonClick: 2 instead of 1"});
+    disconnect(mToolsBar, &ToolsBar::closeButtonClick, mWindow, &TitlerWindow::clearUndoStack);
 }
 
 QTEST_MAIN(tst_WindowWiring)

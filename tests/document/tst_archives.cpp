@@ -148,6 +148,43 @@ private slots:
         QVERIFY(!controller.deleteArchive(file("c.xml")));
     }
 
+    void deleteTakesNothingElse()
+    {
+        makeTitle("kept");
+        write(file("kept_1920.png"), "picture");
+        QVERIFY(QDir(mFolder).mkpath("sub"));
+        const QString outside = base("outside.png");
+        write(outside, "of another folder");
+        Archive archive;
+        archive.setPath(file("foreign.xml").toStdString());
+        archive.setThumbnailBig("../" + QFileInfo(mFolder).fileName().toStdString() + "/kept_1920.png");
+        archive.setThumbnailMiddle("kept.xml");
+        archive.setThumbnailBlack(".order.xml");
+        archive.setThumbnailSmall(QDir(mFolder).relativeFilePath(outside).toStdString());
+        archive.setBgResource("sub/");
+        archive.setBgResourceBig("..");
+        ArchiveManager* const manager = ArchiveManager::getInstance();
+        QCOMPARE(manager->saveArchive(&archive), 1);
+        QVERIFY(FileSyncQueue::flush(std::chrono::seconds(30)));
+        setOrder({"kept.xml"});
+        ArchiveController().deleteUnusefulArchives(mFolder);
+        QCOMPARE(entries(), QStringList({".order.xml", "kept.xml", "kept_1920.png", "sub"}));
+        QVERIFY(QFile::exists(outside));
+        QVERIFY(QFileInfo(file("sub")).isDir());
+    }
+
+    void theFolderOutlivesItsLastTitle()
+    {
+        Archive archive; // names no pictures
+        archive.setPath(file("last.xml").toStdString());
+        ArchiveManager* const manager = ArchiveManager::getInstance();
+        QCOMPARE(manager->saveArchive(&archive), 1);
+        QVERIFY(FileSyncQueue::flush(std::chrono::seconds(30)));
+        QCOMPARE(manager->deleteArchive(archive.getPath()), 1);
+        QVERIFY(QFileInfo(mFolder).isDir());
+        QCOMPARE(entries(), QStringList());
+    }
+
     void newOrderFiles()
     {
         ArchiveManager* const manager = ArchiveManager::getInstance();

@@ -343,6 +343,7 @@ class TitlerTest(unittest.TestCase):
             left, top, columns, rows = TEMPLATE_HEADING
             return [rgb[3 * (y * width + left):3 * (y * width + left + columns)] for y in range(top, top + rows)]
 
+        self.display.wait_until_still()  # it may just be coming to its place
         picker = heading()
         self.click(*TEMPLATE_BUTTONS[button])
         session.wait_until(lambda: heading() != picker, 20 * SLOW, "the template picker to go")

@@ -25,6 +25,7 @@ private slots:
     void deleteOfTheLastSelectedTitle();
     void deleteOfTheOnlyTitle();
     void deleteOfAnotherTitleLeavesTheSelection();
+    void deletedTitleFollowsTheLanguage();
     void deletedFilesGoAtTheNextSynchronization();
     void deleteOfATitleMadeInThisRequest();
     void deleteOfTheCopiedTitleKeepsTheCopy();
@@ -163,6 +164,17 @@ void tst_ArchiveCommands::deleteOfAnotherTitleLeavesTheSelection()
     mStack->undo();
     QCOMPARE(selected(), 0);
     QVERIFY(mCanvas.isEmpty());
+}
+
+void tst_ArchiveCommands::deletedTitleFollowsTheLanguage()
+{
+    open(QStringLiteral("delete language"));
+    QTRY_VERIFY(item(1)->hasChildWidgets());
+    choose(1, ArchiveAction::ACTION_DELETE);
+    mList->setSystemLanFont(QStringLiteral("DFHeiW5-A"));
+    mStack->undo();
+    QCOMPARE(item(1)->getRightChild()->findChild<QLabel*>()->font().family(), QStringLiteral("DFHeiW5-A"));
+    mList->setSystemLanFont(QStringLiteral("KST"));
 }
 
 void tst_ArchiveCommands::deletedFilesGoAtTheNextSynchronization()

@@ -76,6 +76,7 @@ private slots:
     void skippedTitlesLeaveTheOrderAtTheNextChange();
     void unreadableFolder();
     void unwritableFolderMakesNoTitle();
+    void readOnlyTemplateFolderTakesNoTemplate();
     void badPictures_data();
     void badPictures();
     void folderGoneWhileOpen();
@@ -253,6 +254,35 @@ void tst_ArchiveFolders::unwritableFolderMakesNoTitle()
     QCOMPARE(LibraryFixture::order(folder), m->stems());
     m->holdAndChoose(1, ArchiveAction::ACTION_PASTE); // and now it can
     QCOMPARE(m->list->count(), 4);
+}
+
+void tst_ArchiveFolders::readOnlyTemplateFolderTakesNoTemplate()
+{
+    const QString templates = QDir::cleanPath(mFixture.titleRoot() + "/../usertemplates");
+    QDir(templates).removeRecursively();
+    QVERIFY(QDir().mkpath(templates));
+    const QString folder = abc(QStringLiteral("as template"));
+    m->open(folder);
+    QSignalSpy added(m->list, &ArchiveList::addUserSignal);
+    QSignalSpy picker(m->list, &ArchiveList::startUserTemplatePicker);
+    mMessages.take();
+    mReports.take();
+    // Others may reach the title, not the templates.
+    const QString root = QDir::cleanPath(mFixture.titleRoot() + "/../..");
+    QVERIFY(QFile::setPermissions(root, QFile::permissions(root) | QFile::ExeOther | QFile::ReadOther));
+    {
+        const Unreadable rights(templates);
+        m->holdAndChoose(1, ArchiveAction::ACTION_ADD_USER);
+    }
+    QCOMPARE(added.size(), 0); // a failed save is not reported
+    QCOMPARE(picker.size(), 0);
+    QCOMPARE(mReports.take(), Reports());
+    QCOMPARE(m->stems(), (Names{"a", "b", "c"}));
+    QCOMPARE(QDir(templates).entryList(QDir::AllEntries | QDir::NoDotAndDotDot), Names());
+    m->holdAndChoose(1, ArchiveAction::ACTION_ADD_USER); // and now it can
+    QCOMPARE(added.size(), 1);
+    QVERIFY(QFile::exists(templates + "/UserTemplate_001/Titler.xml"));
+    QDir(templates).removeRecursively();
 }
 
 void tst_ArchiveFolders::badPictures_data()

@@ -3,7 +3,9 @@
 #include "TitleListFixture.h"
 
 #include <QSignalSpy>
+#include <functional>
 
+using Change = std::function<void(const QString& folder)>;
 using Names = QStringList;
 using List = TitleListFixture;
 
@@ -42,6 +44,8 @@ private slots:
     void floatingTitleLooksLikeTheOne();
     void closingTheFolderWhileCarrying();
     void cancelledCarryKeepsEveryTitle();
+    void titleGoneFromUnderTheFinger_data();
+    void titleGoneFromUnderTheFinger();
     void ninetyNineTitles();
 
 private:
@@ -512,7 +516,7 @@ void tst_ArchiveTouch::closingTheFolderWhileCarrying()
     m->move(List::HANDLE_X, 500);
     m->release(List::HANDLE_X, 500);
     QVERIFY(m->list->isEmpty());
-    m->mFilter.resetLock(); // nobody is left to let go; otherwise its watchdog does it
+    QVERIFY(!m->isLocked());
     QCOMPARE(LibraryFixture::order(folder), numbered(4)); // nothing was dropped
     m->open(folder);
     QCOMPARE(m->stems(), numbered(4));
@@ -529,6 +533,49 @@ void tst_ArchiveTouch::cancelledCarryKeepsEveryTitle()
     QCOMPARE(m->list->count(), 4);
     QCOMPARE(LibraryFixture::order(folder), m->stems());
     m->release(List::HANDLE_X, 65 + List::ROW);
+}
+
+void tst_ArchiveTouch::titleGoneFromUnderTheFinger_data()
+{
+    QTest::addColumn<Change>("change");
+    QTest::newRow("its making is undone") << Change([this](const QString&) { m->stack.undo(); });
+    QTest::newRow("another folder is opened") << Change([this](const QString&) {
+        m->stack.clear();
+        m->list->refreshArchiveList(folderOf(QStringLiteral("finger after"), 2));
+    });
+    QTest::newRow("its folder gets a new name") << Change([this](const QString& folder) {
+        m->stack.clear();
+        const QString after = mFixture.titleRoot() + QStringLiteral("/finger after");
+        QDir(after).removeRecursively();
+        QVERIFY(QDir().rename(folder, after));
+        m->list->refreshArchiveListForChangeFolderName(folder, after);
+    });
+    QTest::newRow("the folder is closed") << Change([this](const QString&) {
+        m->stack.clear();
+        m->list->cleanArchiveList();
+    });
+}
+
+void tst_ArchiveTouch::titleGoneFromUnderTheFinger()
+{
+    QFETCH(Change, change);
+    const QString folder = openFolder(QStringLiteral("finger before"), 3);
+    m->holdAndChoose(0, ArchiveAction::ACTION_COPY);
+    m->holdAndChoose(0, ArchiveAction::ACTION_PASTE);
+    m->press(List::PICTURE_X, List::ROW + 60);
+    QVERIFY(m->isLocked());
+    change(folder);
+    QVERIFY(!m->isLocked()); // at once, whether the finger is still there or not
+    m->takeCanvas();
+    m->move(List::PICTURE_X, List::ROW + 90);
+    m->release(List::PICTURE_X, List::ROW + 60);
+    m->clock.advance(List::HOLD_TIME);
+    QCOMPARE(m->takeCanvas(), Names());
+    QVERIFY(!m->list->IsOptionMenuShowing());
+    if (m->list->isEmpty())
+        return;
+    m->tapTitle(m->selected() == 0 ? 1 : 0);
+    QCOMPARE(m->takeCanvas().size(), 1);
 }
 
 void tst_ArchiveTouch::ninetyNineTitles()

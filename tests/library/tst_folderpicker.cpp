@@ -85,6 +85,26 @@ private slots:
         }
     }
 
+    void thePictureThatATitleNames()
+    {
+        f.make("news", {"own", "torn"});
+        const QString folder = f.path("news");
+        QVERIFY(QFile::remove(folder + "/own_240.png"));
+        QImage small(240, 135, QImage::Format_RGB32);
+        small.fill(Qt::blue);
+        QVERIFY(small.save(folder + "/own_240.jpg"));
+        const auto record = LibraryFixture::makeRecord(folder, "own", "own");
+        record->setThumbnailSmall("own_240.jpg");
+        QVERIFY(ArchiveController().saveNewArchive(folder, record.get()));
+        QVERIFY(QFile::resize(folder + "/torn.xml", 60));
+        f.open();
+        f.tree()->expand(f.row("news"));
+        f.tap(f.row("own", f.row("news")));
+        QVERIFY(thumbnail()->pixmap().toImage().pixelColor(120, 67).blue() > 240);
+        f.tap(f.row("torn", f.row("news")));
+        QCOMPARE(thumbnail()->pixmap().toImage().pixelColor(120, 67), QColor(Qt::red));
+    }
+
     void opensAFolder()
     {
         f.make("news", {"t1"});
@@ -352,6 +372,13 @@ private slots:
         QCOMPARE(f.messages.take(), (Reports{{115, QStringLiteral("folder")}}));
         f.tapButton("newFolderButton");
         QVERIFY(f.picker->editor());
+        f.escape();
+        // A name takes no room.
+        qputenv("K2SYS_FS_REMAIN", "0");
+        f.hold("news");
+        f.enter("later");
+        QCOMPARE(f.folders(), QStringList{"later"});
+        QCOMPARE(f.messages.take(), Reports());
     }
 
     // --- Names ----------------------------------------------------------------------------------------

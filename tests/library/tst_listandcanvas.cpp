@@ -1,7 +1,9 @@
 // The list, the canvas and the pictures together, wired as the window wires them.
+#include "HoldingReporter.h"
 #include "LibraryFixture.h"
 
 #include "canvas/CanvasScene.h"
+#include "canvas/GraphicsText.h"
 #include "library/ArchiveItem.h"
 #include "library/ArchiveList.h"
 #include "library/ThumbnailRender.h"
@@ -9,6 +11,7 @@
 #include <QLabel>
 #include <QPainter>
 #include <QTest>
+#include <QTextCursor>
 #include <QUndoStack>
 
 class tst_ListAndCanvas : public QObject
@@ -21,7 +24,9 @@ private slots:
     void selectedTitleIsOnTheCanvas();
     void newTitleShowsItsPictureAtOnce();
     void leavingANewTitleWritesItsPictures();
+    void leavingATextThatIsTypedWritesItsPictures();
     void deletedTitleLeavesTheCanvas();
+    void deletedTitleLeavesNoPictures();
     void picturesShowWhatTheCanvasShows();
 
 private:
@@ -123,6 +128,27 @@ void tst_ListAndCanvas::leavingANewTitleWritesItsPictures()
         QVERIFY(!QImage(folder + QLatin1Char('/') + stem + QLatin1String(suffix)).isNull());
 }
 
+void tst_ListAndCanvas::leavingATextThatIsTypedWritesItsPictures()
+{
+    const QString folder = mFixture.makeFolder(QStringLiteral("typed"));
+    LibraryFixture::fillFolder(folder, {QStringLiteral("a"), QStringLiteral("b")});
+    mList->refreshArchiveList(folder);
+    connect(mScene.get(), &CanvasScene::signalPushUndoCommandIntoStack, mStack.get(), &QUndoStack::push);
+    GraphicsText* text = mScene->findTextItem(1);
+    text->setTextInteractionFlags(Qt::TextEditorInteraction);
+    text->textCursor().insertText(QStringLiteral("longer than before "));
+    QTest::mouseClick(mList->archiveItem(1), Qt::LeftButton, Qt::NoModifier, QPoint(20, 20));
+    QCOMPARE(canvasTitle(), QStringLiteral("b"));
+    QVERIFY(!mScene->isEditFinish());
+    QTRY_VERIFY_WITH_TIMEOUT(mScene->isEditFinish(), 20000);
+    const QRect ink = inkIn(QImage(folder + QStringLiteral("/a_1920.png")));
+    QVERIFY(ink.width() > 200);
+    // The other was only looked at.
+    mList->selectArchive(0);
+    QVERIFY(mScene->isEditFinish());
+    QVERIFY(!QFile::exists(folder + QStringLiteral("/b_1920.png")));
+}
+
 void tst_ListAndCanvas::deletedTitleLeavesTheCanvas()
 {
     const QString folder = mFixture.makeFolder(QStringLiteral("delete"));
@@ -135,6 +161,26 @@ void tst_ListAndCanvas::deletedTitleLeavesTheCanvas()
     QVERIFY(QDir(folder).entryList({QStringLiteral("*.xml")}, QDir::Files).isEmpty());
     mStack->redo();
     QCOMPARE(mScene->getTextItemList().size(), 1);
+}
+
+void tst_ListAndCanvas::deletedTitleLeavesNoPictures()
+{
+    HoldingReporter reporter;
+    const QString folder = mFixture.makeFolder(QStringLiteral("trace"));
+    mList->refreshArchiveList(folder);
+    createTitle(QStringLiteral("Kept"));
+    const QString kept = canvasTitle();
+    createTitle(QStringLiteral("Gone"));
+    QVERIFY(reporter.reached.tryAcquire(1, 20000)); // the thread is busy with the first one
+    const QString gone = canvasTitle();
+    QVERIFY(gone != kept);
+    mStack->undo();
+    mList->synchronizationFolderFile();
+    reporter.goOn.release(2);
+    QTRY_VERIFY_WITH_TIMEOUT(mScene->isEditFinish(), 20000);
+    QCOMPARE(QDir(folder).entryList({gone + QLatin1Char('*')}, QDir::Files), QStringList());
+    for (const char* suffix : {".xml", "_1920.png", "_960.png", "_240.png", "_240S.png"})
+        QVERIFY(QFile::exists(folder + QLatin1Char('/') + kept + QLatin1String(suffix)));
 }
 
 void tst_ListAndCanvas::picturesShowWhatTheCanvasShows()

@@ -1,4 +1,5 @@
 // The thread that writes a title's pictures: what it writes, when it counts as finished, what it drops.
+#include "HoldingReporter.h"
 #include "LibraryFixture.h"
 
 #include "library/PictureThread.h"
@@ -8,23 +9,6 @@
 
 namespace
 {
-
-// Holds the worker at the end of a job until the test lets it go on.
-class HoldingReporter : public ITitleChangeReporter
-{
-public:
-    HoldingReporter() { setInstance(this); }
-    ~HoldingReporter() override { setInstance(nullptr); }
-
-    void changeTitlerStatus(FileManagerDefine::emTITLECHANGE_TYPE, QString) override
-    {
-        reached.release();
-        goOn.acquire();
-    }
-
-    QSemaphore reached;
-    QSemaphore goOn;
-};
 
 QList<QImage> pictures(const QColor& colour)
 {
@@ -57,6 +41,8 @@ private slots:
     void jobsAreWrittenInOrder();
     void unwritableFolderIsPassedOver();
     void namesThatLeaveTheFolderAreNotWritten();
+    void deletedTitleKeepsNoPictures_data();
+    void deletedTitleKeepsNoPictures();
 
 private:
     LibraryFixture mFixture;
@@ -190,6 +176,37 @@ void tst_PictureThread::namesThatLeaveTheFolderAreNotWritten()
     QVERIFY(!QFile::exists(mFixture.titleRoot() + QStringLiteral("/stray.png")));
     QCOMPARE(QDir(folder).entryList(QDir::Files | QDir::Hidden, QDir::Name),
              (QStringList{QStringLiteral("t_240.png"), QStringLiteral("t_960.png")}));
+}
+
+void tst_PictureThread::deletedTitleKeepsNoPictures_data()
+{
+    QTest::addColumn<bool>("isBeingWritten");
+    QTest::newRow("waiting") << false;
+    QTest::newRow("being written") << true;
+}
+
+void tst_PictureThread::deletedTitleKeepsNoPictures()
+{
+    QFETCH(bool, isBeingWritten);
+    HoldingReporter reporter;
+    const QString folder = mFixture.makeFolder(QStringLiteral("deleted"));
+    LibraryFixture::fillFolder(folder, {QStringLiteral("gone"), QStringLiteral("kept")});
+    const auto gone = LibraryFixture::makeRecord(folder, QStringLiteral("gone"), QString());
+    const auto kept = LibraryFixture::makeRecord(folder, QStringLiteral("kept"), QString());
+    PictureThread thread;
+    thread.addArchive(isBeingWritten ? gone.get() : kept.get(), pictures(Qt::red));
+    thread.addArchive(isBeingWritten ? kept.get() : gone.get(), pictures(Qt::red));
+    QVERIFY(reporter.reached.tryAcquire(1, 20000));
+    // As the clean-up does it; pictures that come in after this are nobody's.
+    QVERIFY(QFile::remove(folder + QStringLiteral("/gone.xml")));
+    if (!isBeingWritten)
+        QVERIFY(QFile::remove(folder + QStringLiteral("/gone_240.png")));
+    reporter.goOn.release(2);
+    QTRY_VERIFY_WITH_TIMEOUT(thread.isThreadWaiting(), 20000);
+    QCOMPARE(QDir(folder).entryList(QDir::Files, QDir::Name),
+             (QStringList{QStringLiteral("kept.xml"), QStringLiteral("kept_1920.png"),
+                          QStringLiteral("kept_240.png"), QStringLiteral("kept_240S.png"),
+                          QStringLiteral("kept_960.png")}));
 }
 
 QTEST_GUILESS_MAIN(tst_PictureThread)

@@ -1,5 +1,6 @@
 // The template picker under a finger, on folders.
 #include "TemplateFixture.h"
+#include "tests/touchui/TouchFixture.h"
 
 #include "library/ArchiveItem.h"
 #include "library/TemplateItem.h"
@@ -250,6 +251,18 @@ private slots:
         tap(button("selectUserButton"));
         QCOMPARE(selected.size(), 1);
         QCOMPARE(selected[0][0].value<Archive*>(), users()->archive(1));
+    }
+
+    void theLastChoiceIsTold()
+    {
+        mFixture.makeUserTemplate("UserTemplate_001", {"one", "two"});
+        UserTemplatePickerController().saveSelectedTemplate(
+            mFixture.userTitle("UserTemplate_001").toStdString());
+        openUserTab();
+        QCOMPARE(users()->selectedItem(), users()->item(0));
+        QCOMPARE(fileName()->text(), QString("UserTemplate_001"));
+        QCOMPARE(preview()->textLines().mid(0, 2), QStringList({"one", "two"}));
+        QVERIFY(button("deleteTemplateButton")->isEnabled());
     }
 
     void deleteAsksAndDeletes()
@@ -584,6 +597,34 @@ private slots:
         auto* shown = users()->item(0)->findChild<UserTemplateMenu*>();
         QVERIFY(shown && shown->isVisible());
         shown->close();
+    }
+
+    void aTemplateGoneFromUnderTheFinger_data()
+    {
+        QTest::addColumn<bool>("isReload");
+        QTest::newRow("deleted elsewhere") << false;
+        QTest::newRow("all are read again") << true;
+    }
+
+    void aTemplateGoneFromUnderTheFinger()
+    {
+        QFETCH(bool, isReload);
+        const TouchFixture fingers;
+        mFixture.makeUserTemplates(3);
+        openUserTab();
+        const QPoint place = centre(users()->item(1));
+        fingers.press(mPicker.get(), place);
+        QVERIFY(fingers.isLocked());
+        if (isReload)
+            mPicker->reloadTemplates2();
+        else
+            mPicker->slotDeleteUserTemplate(mFixture.userRoot() + "/UserTemplate_002/");
+        QVERIFY(!fingers.isLocked());
+        fingers.lift(mPicker.get(), place);
+        QVERIFY(!users()->selectedItem());
+        QCoreApplication::processEvents();
+        fingers.tap(mPicker.get(), place);
+        QCOMPARE(users()->selectedItem(), users()->item(1));
     }
 
     void manyTemplates()

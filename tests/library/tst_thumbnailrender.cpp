@@ -34,6 +34,7 @@ private slots:
     void fastStageWithoutBackgroundIsTransparent();
     void fastStageScalesTheBackground();
     void missingBackgroundIsPassedOver();
+    void hugeBackgroundGivesPicturesOfTheUsualSize();
     void slowStageWritesFourFiles();
     void slowStageRemovesTheOldBigPicture();
     void textsStandAtOneAndAHalfTimesTheirPlace();
@@ -139,6 +140,22 @@ void tst_ThumbnailRender::missingBackgroundIsPassedOver()
     QVERIFY(inkIn(slowPicture(*archive, "_1920.png")).isEmpty());
     archive->setBgResource("text.png");
     QVERIFY(inkIn(fastPicture(render, *archive)).isEmpty());
+}
+
+void tst_ThumbnailRender::hugeBackgroundGivesPicturesOfTheUsualSize()
+{
+    const QString folder = mFixture.makeFolder(QStringLiteral("huge"));
+    const auto archive = LibraryFixture::makeRecord(folder, QStringLiteral("t"), QStringLiteral("Huge"));
+    archive->setBgResource("bg.png");
+    archive->setBgResourceBig("bg.png");
+    paint(folder + QStringLiteral("/bg.png"), QSize(20000, 1200), Qt::blue);
+    ThumbnailRender render;
+    const QImage fast = fastPicture(render, *archive);
+    QCOMPARE(fast.size(), QSize(240, 135));
+    QCOMPARE(fast.pixelColor(237, 132), QColor(Qt::blue));
+    const QImage big = slowPicture(*archive, "_1920.png");
+    QCOMPARE(big.size(), QSize(1920, 1080));
+    QCOMPARE(big.pixelColor(1917, 1077), QColor(Qt::blue));
 }
 
 void tst_ThumbnailRender::slowStageWritesFourFiles()

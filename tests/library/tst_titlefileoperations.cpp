@@ -129,6 +129,14 @@ void tst_TitleFileOperations::thumbnailWithoutExtensionSkipsTheBackground()
     QVERIFY(made);
     QCOMPARE(made->getThumbnailSmall(), made->getName() + "_240.png");
     QCOMPARE(made->getBgResource(), std::string("old.png"));
+
+    // In another folder this name may be taken.
+    const QString other = mFixture.makeFolder(QStringLiteral("no extension elsewhere"));
+    writeFile(folder + QStringLiteral("/old.png"), "background");
+    writeFile(other + QStringLiteral("/old.png"), "of another title");
+    QVERIFY(mFiles.createFromTemplate(other, *source));
+    QVERIFY(mFiles.createFromCopy(other, *source, TitlePictures()));
+    QCOMPARE(readFile(other + QStringLiteral("/old.png")), QByteArray("of another title"));
 }
 
 void tst_TitleFileOperations::copySurvivesItsSource()
