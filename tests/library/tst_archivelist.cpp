@@ -594,7 +594,7 @@ void tst_ArchiveList::cleaningForgetsTheFolder()
     QVERIFY(mLabel->text().isEmpty());
     QVERIFY(!mList->getSelectedArchive());
     QCoreApplication::processEvents(); // items whose thumbnails were still to come
-    QVERIFY(mList->findChildren<ArchiveItem*>().isEmpty());
+    QTRY_VERIFY(mList->findChildren<ArchiveItem*>().isEmpty());
 }
 
 void tst_ArchiveList::selectionIsScrolledIntoView()
