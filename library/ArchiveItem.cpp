@@ -69,6 +69,13 @@ QString ArchiveItem::getArchiveDataPath() const
     return mArchive ? QString::fromStdString(mArchive->getPath()) : QString();
 }
 
+void ArchiveItem::discard()
+{
+    mArchive = nullptr;
+    hide();
+    deleteLater();
+}
+
 void ArchiveItem::updateArchiveData(Archive* archive)
 {
     if (!archive || !mArchive)

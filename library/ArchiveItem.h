@@ -45,6 +45,10 @@ public:
     ~ArchiveItem() override;
 
     Archive* getArchiveData() const { return mArchive; }
+    // Ends the item: the record goes now, and the item as soon as nothing is being delivered to it.
+    void discard();
+    // Whether there is an item, and it has not been discarded.
+    static bool isUsable(const ArchiveItem* item) { return item && item->mArchive; }
     QString getArchiveDataPath() const;
     // Takes over the contents of the given record; the name that the item's record has is kept.
     void updateArchiveData(Archive* archive);

@@ -382,7 +382,10 @@ void ArchiveList::setMainScene(CanvasScene* mainScene)
 void ArchiveList::clearOldArchiveList()
 {
     removeAll();
-    qDeleteAll(mAllItems); // those that undo commands still hold, too: the commands see it
+    // Those that undo commands still hold, too: the commands see it. The touch that leads here may be on its
+    // way to another finger's item, which must be there to get it.
+    for (ArchiveItem* item : std::as_const(mAllItems))
+        item->discard();
     mAllItems.clear();
     qDeleteAll(mArchives);
     mArchives.clear();

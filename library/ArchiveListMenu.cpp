@@ -183,6 +183,11 @@ void ArchiveList::createArchiveFromTemplate(Archive* temp)
 {
     if (!temp)
         return;
+    // The picker also opens over a full list, to show the template that has just been saved.
+    if (checkArchiveListIsFull()) {
+        ListMessages::post(MessageDef::MESSAGE_LIST_FULL_ON_CREATE, ListMessages::limitText());
+        return;
+    }
     std::unique_ptr<Archive> archive = mFiles.createFromTemplate(mCurrentPath, *temp);
     if (!archive)
         return;

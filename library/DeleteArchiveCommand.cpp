@@ -20,7 +20,7 @@ DeleteArchiveCommand::~DeleteArchiveCommand()
 
 void DeleteArchiveCommand::redo()
 {
-    if (!mItem)
+    if (!ArchiveItem::isUsable(mItem))
         return;
     const QString path = mItem->getArchiveDataPath();
     // Done again, it may meet another selection: a look around at a clean undo stack is no step.
@@ -41,7 +41,7 @@ void DeleteArchiveCommand::redo()
 
 void DeleteArchiveCommand::undo()
 {
-    if (!mItem)
+    if (!ArchiveItem::isUsable(mItem))
         return;
     const QString path = mItem->getArchiveDataPath();
     mList->addWidgetItem(mItem, mPosition);

@@ -35,7 +35,7 @@ void FocusArchiveCommand::undo()
 
 void FocusArchiveCommand::changeFocus(ArchiveItem* from, ArchiveItem* to)
 {
-    if (from == to || !to)
+    if (from == to || !ArchiveItem::isUsable(to))
         return;
     mList->setDefaultItemState(from);
     mList->setSelectItemState(to);

@@ -26,7 +26,7 @@ void MoveArchiveCommand::undo()
 
 void MoveArchiveCommand::moveTo(int position)
 {
-    if (!mItem)
+    if (!ArchiveItem::isUsable(mItem))
         return;
     mList->removeWidgetItem(mItem);
     mList->addWidgetItem(mItem, position);

@@ -18,7 +18,7 @@ PasteArchiveCommand::PasteArchiveCommand(ArchiveList* list, Archive* archive, in
 void PasteArchiveCommand::redo()
 {
     setText(QStringLiteral("PasteArchiveCommand-redo"));
-    if (!mItem)
+    if (!ArchiveItem::isUsable(mItem))
         return;
     const QString path = mItem->getArchiveDataPath();
     mList->addWidgetItem(mItem, mOperationPosition + 1);
@@ -35,7 +35,7 @@ void PasteArchiveCommand::redo()
 void PasteArchiveCommand::undo()
 {
     setText(QStringLiteral("PasteArchiveCommand-undo"));
-    if (!mItem)
+    if (!ArchiveItem::isUsable(mItem))
         return;
     const QString path = mItem->getArchiveDataPath();
     mItem->hide();

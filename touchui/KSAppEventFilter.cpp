@@ -85,7 +85,14 @@ bool KSAppEventFilter::doEventFilter(QObject* obj, QEvent* event)
             return false;
         }
         noticeAcceptedTouch(obj);
-        return !isEnable(obj) || doLock(obj, event) != 0;
+        if (!isEnable(obj)) {
+            // It was disabled under the finger, which holds nothing any more when it goes.
+            if (event->type() == QEvent::TouchEnd && isLock(obj, LOCKMETHOD_TOUCH)) {
+                tryUnlock(obj, LOCKMETHOD_TOUCH);
+            }
+            return true;
+        }
+        return doLock(obj, event) != 0;
     case QEvent::TouchCancel:
         if (obj->isWindowType()) {
             watchIgnoredTouch(event);

@@ -1,52 +1,41 @@
-// Fingers that touch the canvas and the panel of a window anywhere and in any order, for tests: seeded, so
-// that a run can be repeated.
+// Two fingers that touch a program one event at a time, at random but seeded, so that a run can be repeated.
+// Where they go down, where they leap to and what happens between touches is the subclass's.
 #pragma once
 
-#include "app/TitlerWindow.h"
-#include "canvas/CanvasScene.h"
-#include "canvas/GraphicsText.h"
-#include "canvas/GraphicsView.h"
-
-#include <QAction>
 #include <QApplication>
-#include <QInputMethodEvent>
 #include <QPointer>
 #include <QPointingDevice>
 #include <QRandomGenerator>
+#include <QStringList>
 #include <QTest>
+#include <QWidget>
 #include <QWindow>
+#include <algorithm>
 #include <array>
+#include <cstdio>
 #include <qpa/qwindowsysteminterface.h>
+#include <tuple>
 
 class MonkeyFingers
 {
 public:
-    MonkeyFingers(TitlerWindow& window, QPointingDevice* device, quint32 seed)
-        : m_window(window)
-        , m_view(*window.findChild<GraphicsView*>())
-        , m_scene(*window.findChild<CanvasScene*>())
-        , m_device(device)
-        , m_random(seed)
-    {
-        const QList<QAction*> actions = window.findChildren<QAction*>(QString(), Qt::FindDirectChildrenOnly);
-        for (QAction* action : actions) {
-            if (action->text().startsWith(QLatin1String("Undo")) ||
-                action->text().startsWith(QLatin1String("Redo")))
-                m_undoAndRedo.append(action);
-        }
-    }
+    MonkeyFingers(QPointingDevice* device, quint32 seed) : m_random(seed), m_device(device) {}
+    virtual ~MonkeyFingers() = default;
 
     int touches() const { return m_touches; }
     bool isTouching() const { return m_fingers[0].down || m_fingers[1].down; }
     // What the last touches were, for the report of a failure.
     QStringList lastTouches() const { return m_last; }
+    // Of all touches; the same for the same course.
+    quint32 checksum() const { return m_checksum; }
 
-    // One touch event, and now and then what an operator does between touches.
+    // One touch event, and now and then what happens between touches.
     void act()
     {
         if (!m_fingers[0].down) {
             betweenTouches();
-            pressFirst();
+            if (!isTouching())
+                pressFirst();
             return;
         }
         const int kind = below(100);
@@ -62,52 +51,94 @@ public:
 
     void liftAll()
     {
-        while (m_fingers[0].down || m_fingers[1].down)
+        while (isTouching())
             releaseOne();
     }
 
 private:
     struct Finger {
         bool down = false;
+        int id = 0;
         QPoint point; // of the touched window
     };
+
+protected:
+    struct Aim {
+        QWidget* window = nullptr;
+        QPoint point; // of the window
+    };
+
+    virtual void betweenTouches() = 0;
+    // Where the first finger goes down; none without a window.
+    virtual Aim aim() = 0;
+    // Where another finger goes down, and where one leaps to.
+    virtual QPoint pointOf(QWidget* window) = 0;
 
     int below(int limit) { return m_random.bounded(limit); }
     QPoint within(const QRect& area)
     {
         return area.topLeft() + QPoint(below(qMax(area.width(), 1)), below(qMax(area.height(), 1)));
     }
+    template <class List>
+    auto anyOf(const List& list)
+    {
+        return list.at(below(int(list.size())));
+    }
 
-    // Other windows that are open: popups of the panel, its palette, its slider.
-    QWidget* openPopup() const
+    // Windows that are open beside the one: popups, dialogs, balloons; always in the same order.
+    static QWidgetList windowsBeside(const QWidget* main)
     {
-        const QWidgetList windows = QApplication::topLevelWidgets();
-        for (QWidget* widget : windows) {
-            if (widget != &m_window && widget->isVisible() && widget->windowHandle())
-                return widget;
-        }
-        return nullptr;
+        QWidgetList windows = QApplication::topLevelWidgets();
+        erase_if(windows, [main](const QWidget* widget) {
+            return widget == main || !widget->isVisible() || !widget->windowHandle() ||
+                   widget->windowFlags().testFlag(Qt::WindowTransparentForInput);
+        });
+        const auto key = [](const QWidget* widget) {
+            return std::make_tuple(QLatin1String(widget->metaObject()->className()), widget->x(), widget->y(),
+                                   widget->width());
+        };
+        std::sort(windows.begin(), windows.end(),
+                  [key](const QWidget* a, const QWidget* b) { return key(a) < key(b); });
+        return windows;
     }
-    QPoint pointOnCanvas()
-    {
-        const QList<GraphicsText*> texts = m_scene.getTextItemList();
-        QRect area = m_view.rect();
-        if (!texts.isEmpty() && below(4) != 0) {
-            const GraphicsText* text = texts.at(below(int(texts.size())));
-            const QRect object = m_view.mapFromScene(text->sceneBoundingRect()).boundingRect();
-            area = object.adjusted(-20, -20, 20, 20).intersected(m_view.rect());
-        }
-        return m_view.mapTo(&m_window, within(area));
-    }
-    QPoint anyPoint() { return below(10) < 7 ? pointOnCanvas() : within(TitlerWindow::TEXT_PROPERTY_RECT); }
 
     void pressFirst()
     {
-        QWidget* popup = openPopup();
-        m_touched = popup && below(2) == 0 ? popup : &m_window;
-        m_fingers[0] = {true, m_touched == &m_window ? anyPoint() : within(m_touched->rect())};
+        const Aim aimed = aim();
+        if (!aimed.window)
+            return;
+        m_touched = aimed.window;
+        m_fingers[0] = {true, ++m_lastId, aimed.point};
         send(0, QEventPoint::Pressed);
     }
+    // Without the first finger the second goes on as the first. What a release opens may run a loop of its
+    // own in which other touches come: those find no finger down.
+    void releaseOne()
+    {
+        const int index = m_fingers[1].down && (!m_fingers[0].down || below(2) == 0) ? 1 : 0;
+        const std::array<Finger, 2> fingers = m_fingers;
+        const QPointer<QWidget> window = m_touched;
+        m_fingers[size_t(index)].down = false;
+        if (index == 0)
+            m_fingers[1].down = false;
+        send(window, fingers[size_t(index)], fingers[size_t(1 - index)], QEventPoint::Released);
+        if (index == 0 && fingers[1].down)
+            send(window, fingers[1], Finger(), QEventPoint::Released);
+    }
+    void note(const QString& touch)
+    {
+        constexpr int Noted = 20;
+        m_last.append(touch);
+        for (const QChar character : touch)
+            m_checksum = (m_checksum ^ character.unicode()) * 16777619U;
+        if (m_trace)
+            fprintf(stderr, "%s\n", qPrintable(touch));
+        if (m_last.size() > Noted)
+            m_last.removeFirst();
+    }
+    QWidget* touched() const { return m_touched; }
+
+private:
     void useSecond()
     {
         Finger& finger = m_fingers[1];
@@ -118,7 +149,7 @@ private:
         }
         if (!touchedIsOpen())
             return releaseOne();
-        finger = {true, m_touched == &m_window ? anyPoint() : within(m_touched->rect())};
+        finger = {true, ++m_lastId, pointOf(m_touched)};
         send(1, QEventPoint::Pressed);
     }
     QPoint near(QPoint point) { return point + QPoint(below(121) - 60, below(81) - 40); }
@@ -127,19 +158,8 @@ private:
         const int index = m_fingers[1].down && below(2) == 0 ? 1 : 0;
         Finger& finger = m_fingers[size_t(index)];
         // Small steps as a finger makes them, and leaps.
-        finger.point = below(5) == 0 && m_touched == &m_window ? anyPoint() : near(finger.point);
+        finger.point = below(5) == 0 && touchedIsOpen() ? pointOf(m_touched) : near(finger.point);
         send(index, QEventPoint::Updated);
-    }
-    void releaseOne()
-    {
-        const int index = m_fingers[1].down && (!m_fingers[0].down || below(2) == 0) ? 1 : 0;
-        m_fingers[size_t(index)].down = false;
-        send(index, QEventPoint::Released);
-        // Without the first finger the second goes on as the first.
-        if (index == 0 && m_fingers[1].down) {
-            m_fingers[1].down = false;
-            send(1, QEventPoint::Released);
-        }
     }
     void cancel()
     {
@@ -150,96 +170,57 @@ private:
             QWindowSystemInterface::handleTouchCancelEvent<QWindowSystemInterface::SynchronousDelivery>(
                 m_touched->windowHandle(), m_device);
     }
-    bool touchedIsOpen() const { return m_touched && m_touched->isVisible() && m_touched->windowHandle(); }
+    bool touchedIsOpen() const { return isOpen(m_touched); }
+    static bool isOpen(const QWidget* window)
+    {
+        return window && window->isVisible() && window->windowHandle();
+    }
 
     void send(int index, QEventPoint::State state)
     {
+        send(m_touched, m_fingers[size_t(index)], m_fingers[size_t(1 - index)], state);
+    }
+    void send(QWidget* touched, const Finger& finger, const Finger& other, QEventPoint::State state)
+    {
         ++m_touches;
-        // A popup may close under the finger; its touch ends with it.
-        if (!touchedIsOpen()) {
+        // A window may close under its fingers: what is left to them is to go up.
+        if (!isOpen(touched)) {
+            note(QStringLiteral("the window has closed under the finger"));
             m_fingers = {};
-            return;
+            if (!touched || !touched->windowHandle())
+                return;
+            state = QEventPoint::Released;
+            if (other.down)
+                send(touched, other, Finger(), state);
         }
-        QWindow* window = m_touched->windowHandle();
+        QWindow* window = touched->windowHandle();
         auto sequence = QTest::touchEvent(window, m_device, false);
-        for (int i = 0; i < int(m_fingers.size()); ++i) {
-            const Finger& finger = m_fingers[size_t(i)];
-            if (i != index) {
-                if (finger.down)
-                    sequence.stationary(i + 1);
-            } else if (state == QEventPoint::Pressed) {
-                sequence.press(i + 1, finger.point, window);
-            } else if (state == QEventPoint::Released) {
-                sequence.release(i + 1, finger.point, window);
-            } else {
-                sequence.move(i + 1, finger.point, window);
-            }
-        }
+        if (other.down)
+            sequence.stationary(other.id);
+        if (state == QEventPoint::Pressed)
+            sequence.press(finger.id, finger.point, window);
+        else if (state == QEventPoint::Released)
+            sequence.release(finger.id, finger.point, window);
+        else
+            sequence.move(finger.id, finger.point, window);
         note(QString("finger %1 %2 at %3,%4 of %5")
-                 .arg(index)
+                 .arg(finger.id)
                  .arg(state == QEventPoint::Pressed    ? "down"
                       : state == QEventPoint::Released ? "up"
                                                        : "moves")
-                 .arg(m_fingers[size_t(index)].point.x())
-                 .arg(m_fingers[size_t(index)].point.y())
-                 .arg(m_touched->metaObject()->className()));
+                 .arg(finger.point.x())
+                 .arg(finger.point.y())
+                 .arg(touched->metaObject()->className()));
         sequence.commit(false);
     }
-    void note(const QString& touch)
-    {
-        constexpr int Noted = 12;
-        m_last.append(touch);
-        if (m_last.size() > Noted)
-            m_last.removeFirst();
-    }
 
-    // Timers stand still here, so that a run does not depend on the speed of the machine; what they would
-    // have done happens at random instead.
-    void betweenTouches()
-    {
-        const int kind = below(60);
-        if (kind < 40)
-            m_view.mouseClick(); // the next tap is no double tap
-        else if (kind < 44)
-            type();
-        else if (kind == 44)
-            m_window.slotNewTextButtonClicked();
-        else if (kind == 45 && !m_undoAndRedo.isEmpty())
-            m_undoAndRedo.at(below(int(m_undoAndRedo.size())))->trigger();
-        else if (kind < 50)
-            passTime();
-    }
-    void type()
-    {
-        static const QStringList pieces{QStringLiteral("a"),     QStringLiteral("B c"),
-                                        QString::fromUtf8("快"), QString::fromUtf8("속"),
-                                        QString::fromUtf8("😀"),  QString::fromUtf8("e\u0301"),
-                                        QStringLiteral("\n")};
-        if (!m_scene.itemIsEditorInteraction())
-            return;
-        QInputMethodEvent commit;
-        commit.setCommitString(pieces.at(below(int(pieces.size()))));
-        QCoreApplication::sendEvent(&m_view, &commit);
-    }
-    void passTime()
-    {
-        const QList<GraphicsText*> texts = m_scene.getTextItemList();
-        for (GraphicsText* text : texts) {
-            if (below(2) == 0)
-                text->slotLongPressed();
-            else
-                text->pushLastEditTextIntoStack();
-        }
-    }
-
-    TitlerWindow& m_window;
-    GraphicsView& m_view;
-    CanvasScene& m_scene;
-    QPointingDevice* m_device;
     QRandomGenerator m_random;
-    QList<QAction*> m_undoAndRedo;
+    QPointingDevice* m_device;
     std::array<Finger, 2> m_fingers;
     QPointer<QWidget> m_touched;
     QStringList m_last;
     int m_touches = 0;
+    int m_lastId = 0;
+    quint32 m_checksum = 2166136261U;
+    bool m_trace = qEnvironmentVariableIsSet("TITLER_TRACE"); // tells each touch as it comes
 };

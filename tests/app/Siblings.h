@@ -52,6 +52,8 @@ public:
         return methods;
     }
 
+    qsizetype countOf(long service, long method) const { return methodsOf(service).count(method); }
+
     // Packed arguments of the last call of the method; empty when it was not called.
     QByteArray lastArguments(long service, long method) const
     {

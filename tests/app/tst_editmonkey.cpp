@@ -1,15 +1,14 @@
 // Many touches anywhere on the canvas and the panel of the real window. TITLER_SEED repeats a run,
 // TITLER_TOUCHES changes its length: a hundred thousand take some minutes.
 #include "../canvas/StyleProperties.h"
-#include "MonkeyFingers.h"
+#include "CanvasFingers.h"
+#include "MonkeyGround.h"
 #include "Siblings.h"
-#include "app/APPEventFilter.h"
 #include "document/Archive.h"
 #include "document/ArchiveController.h"
 #include "document/ArchiveOrder.h"
 #include "document/TitleParser.h"
 #include "document/TitleParserUtility.h"
-#include "touchui/KSInputContext.h"
 
 #include <QDir>
 #include <QElapsedTimer>
@@ -17,6 +16,9 @@
 #include <QFileInfo>
 #include <QProcess>
 #include <QTemporaryDir>
+
+using MonkeyGround::heldLocks;
+using MonkeyGround::number;
 
 namespace
 {
@@ -33,29 +35,6 @@ constexpr int TouchesPerFrame = 50;
 constexpr int ReplayTimeout = 60000;
 // Set in a process that only runs the monkey and writes there what the title became.
 constexpr char DigestVariable[] = "TITLER_MONKEY_DIGEST";
-
-int number(const char* variable, int otherwise)
-{
-    bool ok = false;
-    const int value = qEnvironmentVariableIntValue(variable, &ok);
-    return ok && value > 0 ? value : otherwise;
-}
-
-// An application whose timers stand still when told to.
-class Application : public QApplication
-{
-public:
-    using QApplication::QApplication;
-    bool notify(QObject* receiver, QEvent* event) override
-    {
-        if (frozen && event->type() == QEvent::Timer)
-            return true;
-        return QApplication::notify(receiver, event);
-    }
-    bool frozen = false;
-};
-
-Application* application = nullptr;
 
 QString describe(const std::vector<TText*>& texts)
 {
@@ -87,36 +66,10 @@ float asSaved(float place)
     return QString::fromStdString(TitleParserUtility::fromDouble(place)).toFloat();
 }
 
-// Every step saves the title; in memory that does not wait for a disk.
-QString dataFolder()
-{
-    const QString memory = QStringLiteral("/dev/shm");
-    return QFileInfo(memory).isWritable() ? memory : QDir::tempPath();
-}
-
 QByteArray bytesOf(const QString& path)
 {
     QFile file(path);
     return file.open(QIODevice::ReadOnly) ? file.readAll() : QByteArray();
-}
-
-// Who holds the touch; empty when nobody does.
-QString heldLocks()
-{
-    QStringList held;
-    const auto locks = APPEventFilter::instance()->activateLockObjects();
-    for (auto lock = locks.begin(); lock != locks.end(); ++lock) {
-        held += QString("a lock of %1 objects is held by").arg(lock.key()->registeredObj().size());
-        for (const QObject* holder : lock.value())
-            held += QString::fromLatin1(holder->metaObject()->className()) + ' ' + holder->objectName();
-    }
-    return held.join('\n');
-}
-
-void showWarnings(QtMsgType type, const QMessageLogContext&, const QString& text)
-{
-    if (type == QtCriticalMsg || type == QtFatalMsg)
-        fprintf(stderr, "%s\n", qPrintable(text));
 }
 
 } // namespace
@@ -138,7 +91,7 @@ private:
     QString misplaced() const;
     QByteArray replay(const QString& name);
 
-    QTemporaryDir mData{dataFolder() + QStringLiteral("/monkey")};
+    QTemporaryDir mData{MonkeyGround::dataFolder() + QStringLiteral("/monkey")};
     Siblings mSiblings;
     TitlerWindow* mWindow = nullptr;
     QPointingDevice* mDevice = nullptr;
@@ -151,22 +104,16 @@ void tst_editmonkey::initTestCase()
     mSeed = quint32(number("TITLER_SEED", DefaultSeed));
     mTouches = number("TITLER_TOUCHES", DefaultTouches);
     qInfo("seed %u, %d touches", mSeed, mTouches);
-    // A line for every save would be all that is to be seen.
-    qInstallMessageHandler(showWarnings);
+    MonkeyGround::showErrorsOnly();
     QVERIFY(mSiblings.listenOnFreePorts());
-    APPEventFilter::instance();
-    Q_INIT_RESOURCE(UILibrary);
-    Q_INIT_RESOURCE(TitlerToolResource);
     mDevice = QTest::createTouchDevice();
     mDevice->setParent(this);
-    mWindow = new TitlerWindow(true, nullptr);
-    pMainWindow = mWindow;
-    mWindow->setRealClose(false);
+    mWindow = makeWaitingWindow();
 }
 
 void tst_editmonkey::cleanupTestCase()
 {
-    application->frozen = false;
+    MonkeyGround::Application::instance()->frozen = false;
     delete mWindow;
     pMainWindow = nullptr;
     APPEventFilter::release();
@@ -229,16 +176,14 @@ void tst_editmonkey::manyTouches()
     mWindow->showTitlerWindow({_titler_paramter::CREATE_OR_EDIT, path.toStdWString()});
     QVERIFY(QTest::qWaitForWindowExposed(mWindow));
     QCOMPARE(scene()->getTextItemList().size(), 2);
-    application->frozen = true;
+    MonkeyGround::Application::instance()->frozen = true;
     QElapsedTimer clock;
     clock.start();
 
-    MonkeyFingers fingers(*mWindow, mDevice, mSeed);
+    CanvasFingers fingers(*mWindow, mDevice, mSeed);
     for (int steps = 1; fingers.touches() < mTouches; ++steps) {
         fingers.act();
         if (!fingers.isTouching()) {
-            // The gate frees what is left once the widgets have had their turn.
-            QCoreApplication::sendPostedEvents(APPEventFilter::instance(), QEvent::MetaCall);
             QVERIFY2(misplaced().isEmpty(),
                      qPrintable(misplaced() + "\n" + fingers.lastTouches().join('\n')));
             QVERIFY2(heldLocks().isEmpty(),
@@ -254,7 +199,7 @@ void tst_editmonkey::manyTouches()
         mSiblings.forget();
     }
     fingers.liftAll();
-    application->frozen = false;
+    MonkeyGround::Application::instance()->frozen = false;
     QCOMPARE(heldLocks(), QString());
     const qint64 touched = clock.elapsed();
 
@@ -319,13 +264,7 @@ void tst_editmonkey::seedReplays()
 
 int main(int argc, char** argv)
 {
-    KSInputContext::install();
-    Application owned(argc, argv);
-    application = &owned;
-    owned.setObjectName(QStringLiteral("Titler"));
-    QApplication::setQuitOnLastWindowClosed(false);
-    tst_editmonkey test;
-    return QTest::qExec(&test, argc, argv);
+    return MonkeyGround::run<tst_editmonkey>(argc, argv);
 }
 
 #include "tst_editmonkey.moc"

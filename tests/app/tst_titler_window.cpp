@@ -17,6 +17,7 @@
 #include "document/TText.h"
 #include "document/TextStyle.h"
 #include "document/TitleParser.h"
+#include "library/ArchiveItem.h"
 #include "library/ArchiveList.h"
 #include "touchui/KSInputContext.h"
 #include "touchui/KSPushbutton.h"
@@ -25,9 +26,12 @@
 #include <QApplication>
 #include <QDir>
 #include <QLabel>
+#include <QPointer>
+#include <QPointingDevice>
 #include <QSignalSpy>
 #include <QTemporaryDir>
 #include <QTest>
+#include <QWindow>
 
 class tst_titler_window : public QObject
 {
@@ -46,6 +50,7 @@ private slots:
     void missingPathHidesAgain();
     void closeHidesAndEmpties();
     void closeWithNewFilesAsksFirst();
+    void closeWhileFingersRestOnTitles();
     void otherMessagesDoNotClose();
     void createSessionAnswersInFolderOrder();
     void focusCommandLeavesACleanStackClean();
@@ -212,6 +217,41 @@ void tst_titler_window::closeWithNewFilesAsksFirst()
     QVERIFY(mWindow->isVisible());
     mWindow->continueCloseTitler({1, MessageDefine::CLOSE_OK, MessageDef::MESSAGE_CONFIRM_CLOSE});
     QVERIFY(!mWindow->isVisible());
+}
+
+// The touch that closes goes to all fingers, in no certain order.
+void tst_titler_window::closeWhileFingersRestOnTitles()
+{
+    const QString folder = writeFolder("fingers", {"t1", "t2", "t3", "t4", "t5"});
+    QPointingDevice* device = QTest::createTouchDevice();
+    device->setParent(this);
+    const auto* close = mWindow->findChild<ToolsBar*>()->findChild<KSPushbutton*>(QStringLiteral("Close"));
+    const QPoint onClose = close->mapTo(mWindow, close->rect().center());
+    for (int session = 0; session < 4; ++session) {
+        request(folder);
+        QVERIFY(QTest::qWaitForWindowExposed(mWindow));
+        QCOMPARE(list()->count(), 5);
+        const QPointer<ArchiveItem> item = list()->archiveItem(0);
+        QWindow* window = mWindow->windowHandle();
+        QTest::touchEvent(window, device).press(0, onClose, window);
+        auto down = QTest::touchEvent(window, device, false);
+        auto up = QTest::touchEvent(window, device, false);
+        auto gone = QTest::touchEvent(window, device, false);
+        down.stationary(0);
+        up.release(0, onClose, window);
+        for (int i = 0; i < 5; ++i) {
+            const QPoint onTitle = list()->archiveItem(i)->mapTo(mWindow, QPoint(60, 60));
+            down.press(1 + i, onTitle, window);
+            up.stationary(1 + i);
+            gone.release(1 + i, onTitle, window);
+        }
+        down.commit();
+        QVERIFY(mWindow->isVisible());
+        up.commit();
+        QVERIFY(!mWindow->isVisible());
+        QTRY_VERIFY(!item);
+        gone.commit();
+    }
 }
 
 void tst_titler_window::otherMessagesDoNotClose()

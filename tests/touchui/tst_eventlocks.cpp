@@ -91,6 +91,7 @@ private Q_SLOTS:
     void aVanishedHolderIsCutOff();
     void sixthObjectOfAClusterIsSwallowed();
     void disabledWidgetIsShut();
+    void disabledUnderTheFingerFreesTheLock();
     void gestureIsSwallowed();
     void cancelFreesTheLock();
     void anIgnoredTouchFreesTheLock();
@@ -436,6 +437,17 @@ void TestEventLocks::gestureIsSwallowed()
     QVERIFY(m_filter->doEventFilter(m_first, &gesture));
     QEvent other(QEvent::Timer);
     QVERIFY(!m_filter->doEventFilter(m_first, &other));
+}
+
+void TestEventLocks::disabledUnderTheFingerFreesTheLock()
+{
+    QSignalSpy clicked(m_first, &QAbstractButton::clicked);
+    touch(m_first, 0);
+    m_first->setEnabled(false);
+    lift(m_first, 0);
+    QVERIFY(!m_filter->isLock(nullptr, LOCKMETHOD_TOUCH));
+    m_first->setEnabled(true);
+    QCOMPARE(clicked.count(), 0);
 }
 
 void TestEventLocks::cancelFreesTheLock()

@@ -1,0 +1,86 @@
+// The soft keyboard service of the monkeys: knows whether it is up, and answers as the service does.
+#pragma once
+
+#include "messaging/services/ISoftKeyBoardController.h"
+#include "touchui/KSInputContext.h"
+
+#include <QEvent>
+#include <QString>
+
+class SoftKeyboardStandIn : public ISoftKeyBoardController
+{
+public:
+    bool isUp() const { return m_up; }
+    // Of a folder's name or a number, not of a text on the canvas.
+    bool isForLine() const { return m_field.fieldKind == 1; }
+    int limits() const { return m_limits; }
+
+    // What the service tells on its own, sooner or later, about having closed.
+    void settle()
+    {
+        if (!m_tellClosed)
+            return;
+        m_tellClosed = false;
+        context()->sendSoftKeyboardState(false);
+    }
+
+    // The operator types on it and presses Enter.
+    void typeLine(const QString& text)
+    {
+        for (qsizetype length = 1; length <= text.size(); length += 5)
+            context()->sendInputStringOnTextChanged(text.left(length).toStdWString());
+        context()->sendInputStringOnEnterPressing(text.toStdWString());
+        press(Qt::Key_Return, QStringLiteral("\r"));
+    }
+    void type(const QString& text) { context()->sendInputString(text.toStdWString()); }
+    void press(int key, const QString& text = QString())
+    {
+        for (const int type : {int(QEvent::KeyPress), int(QEvent::KeyRelease)}) {
+            SubCommonDefine::tagSoftKeyBoardKeyData data;
+            data.eventType = type;
+            data.key = key;
+            data.text = text.toStdWString();
+            context()->sendKey(data);
+        }
+    }
+    void select(int begin, int end, int mode)
+    {
+        context()->sendInputStringSelectionPos({begin, end, end, mode});
+    }
+    // With its own key.
+    void putAway()
+    {
+        SubCommonDefine::tagSoftKeyBoardKeyData data;
+        data.eventType = KSInputContext::SoftKeyBoardCloseType;
+        m_up = false;
+        context()->sendKey(data);
+    }
+
+    void show(SubCommonDefine::tagSoftKeyBoardInitData data) override
+    {
+        m_field = data;
+        m_up = true;
+        m_tellClosed = false;
+    }
+    void close() override
+    {
+        m_up = false;
+        m_tellClosed = true;
+    }
+    void dummyClose() override { m_up = false; }
+    void simpleClose() override { m_up = false; }
+    void sendKey(SubCommonDefine::tagSoftKeyBoardKeyData) override {}
+    void sendLimitInfo(SubCommonDefine::taLimitInfo info) override { m_limits += info.code != 0 ? 1 : 0; }
+    void closeLimitBalloon() override {}
+    void registerCallBack(ISoftKeyBoardControllerCallBack*) override {}
+    void showMask() override {}
+    void hideMask() override {}
+
+private:
+    static KSInputContext* context() { return KSInputContext::instance(); }
+
+    SubCommonDefine::tagSoftKeyBoardInitData m_field;
+    bool m_up = false;
+    bool m_tellClosed = false;
+    int m_limits = 0;
+};
