@@ -75,6 +75,7 @@ int runPairs(std::vector<char*> arguments, const BenchEnvironment& environment)
     Topics::addEditing(list);
     Topics::addTitleFiles(list, environment);
     Topics::addList(list, environment);
+    Topics::addPaste(list, environment);
     Topics::addFilter(list);
     Topics::addMessaging(list);
     Topics::addStart(list);

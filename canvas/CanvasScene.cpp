@@ -126,6 +126,8 @@ bool CanvasScene::archiveIsNull(const Archive* archive)
 
 void CanvasScene::slotUpdateArchive(const Archive* archive)
 {
+    // A pasted title has the background of the one that it was copied from, which is often on the canvas.
+    const auto previous = m_currentPixmapItem ? m_currentPixmapItem->source() : nullptr;
     savePreviousArchiveInfo();
     if (archiveIsNull(archive))
         return;
