@@ -30,6 +30,7 @@ constexpr double FLICK_AIM = 1.3;
 constexpr double BUILD_AIM = 2.0;
 constexpr double TAP_AIM = 1.5;
 constexpr double OPEN_AIM = 1.5;
+constexpr double FIRST_SCREEN_AIM = 0.15;
 constexpr int TITLES = 99;
 constexpr int TICK_PIXELS = 24; // of a brisk flick
 constexpr int CHARACTERS = 100;
@@ -251,7 +252,26 @@ private:
     bool mIsPainted = false;
 };
 
+void closeFolder(ShownList& shown)
+{
+    shown.list.cleanArchiveList();
+    ShownList::show(shown.list);
+}
+
 void openFolder(benchmark::State& state, const QString& folder)
+{
+    ShownList shown;
+    for ([[maybe_unused]] auto _ : state) {
+        shown.open(folder);
+        state.PauseTiming();
+        if (shown.list.count() != TITLES)
+            state.SkipWithError("the folder was not opened");
+        closeFolder(shown);
+        state.ResumeTiming();
+    }
+}
+
+void openFirstScreen(benchmark::State& state, const QString& folder)
 {
     ShownList shown;
     FirstScreen first(state, shown.list);
@@ -261,8 +281,7 @@ void openFolder(benchmark::State& state, const QString& folder)
         while (!first.isPainting())
             QCoreApplication::processEvents();
         first.end();
-        shown.list.cleanArchiveList();
-        ShownList::show(shown.list);
+        closeFolder(shown);
         state.ResumeTiming();
     }
 }
@@ -293,4 +312,8 @@ void Topics::addList(PairList& list, const BenchEnvironment& environment)
         {"folder_open", OPEN_AIM, PairList::Clock::Wall}, benchmark::kMillisecond,
         [place](benchmark::State& state) { openFolder(state, titleFolder(*place)); },
         [place](benchmark::State& state) { decodePictures(state, smallPictures(titleFolder(*place))); });
+    list.add(
+        {"folder_first_screen", FIRST_SCREEN_AIM, PairList::Clock::Wall}, benchmark::kMillisecond,
+        [place](benchmark::State& state) { openFirstScreen(state, titleFolder(*place)); },
+        [place](benchmark::State& state) { openFolder(state, titleFolder(*place)); });
 }

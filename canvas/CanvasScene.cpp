@@ -126,8 +126,7 @@ bool CanvasScene::archiveIsNull(const Archive* archive)
 
 void CanvasScene::slotUpdateArchive(const Archive* archive)
 {
-    // A pasted title has the background of the one that it was copied from, which is often on the canvas.
-    const auto previous = m_currentPixmapItem ? m_currentPixmapItem->source() : nullptr;
+    const auto previous = m_currentPixmapItem ? m_currentPixmapItem->source() : nullptr; // a paste shares it
     savePreviousArchiveInfo();
     if (archiveIsNull(archive))
         return;
@@ -140,8 +139,7 @@ void CanvasScene::slotUpdateArchive(const Archive* archive)
         addCGraphicsPixmapItem(background, QPointF(m_archive->getBgPointX(), m_archive->getBgPointY()),
                                m_archive->getBgPointZ());
     }
-    const std::vector<TText*> records = m_archive->getText();
-    for (TText* record : records) {
+    for (TText* record : m_archive->getText()) {
         if (record)
             buildPair(record);
     }

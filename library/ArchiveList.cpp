@@ -9,6 +9,7 @@
 #include "library/ArchiveMenu.h"
 #include "library/FocusArchiveCommand.h"
 #include "library/ITitlerFolderReporter.h"
+#include "library/SmallPictures.h"
 #include "support/LeftoverSweep.h"
 #include "support/LogManager.h"
 
@@ -148,6 +149,10 @@ void ArchiveList::getArchiveListSuccessed(QList<Archive*> archivesList)
 void ArchiveList::addRecords(const QList<Archive*>& archives)
 {
     mArchives = archives;
+    QStringList pictures;
+    for (const Archive* archive : mArchives)
+        pictures.append(archive->getFullPathOfThumbnailSmall());
+    mSmallPictures = std::make_unique<SmallPictures>(pictures, ArchiveItem::PICTURE_SIZE);
     QList<KSBaseItemWidget*> items;
     for (Archive* archive : mArchives)
         items.append(createBaseItem(archive));
@@ -178,9 +183,14 @@ void ArchiveList::slotAddArchiveData()
 void ArchiveList::slotAddOneArchiveData(ArchiveItem* item)
 {
     // The folder may have changed while the call was queued.
-    if (!mAllItems.contains(item))
+    const qsizetype index = mAllItems.indexOf(item);
+    if (index < 0)
         return;
-    item->initArchiveItemChildWidget();
+    // The first items are those of the records, in their order.
+    if (!item->hasChildWidgets())
+        item->initArchiveItemChildWidget(mSmallPictures ? mSmallPictures->take(index) : QImage());
+    if (mSmallPictures && index + 1 == mSmallPictures->count())
+        mSmallPictures.reset();
     // Queued calls come before updates: what is on screen does not wait for the rest of a long folder.
     if (getItemIndex(item) == lastVisibleItem())
         viewport()->repaint();
@@ -382,6 +392,7 @@ void ArchiveList::setMainScene(CanvasScene* mainScene)
 void ArchiveList::clearOldArchiveList()
 {
     removeAll();
+    mSmallPictures.reset();
     qDeleteAll(mAllItems); // those that undo commands still hold, too: the commands see it
     mAllItems.clear();
     qDeleteAll(mArchives);

@@ -29,6 +29,7 @@ class CanvasScene;
 class ITitlerAPPEventFilterController;
 class QAction;
 class QLabel;
+class SmallPictures;
 class QUndoCommand;
 
 class ArchiveList : public KSScrollViewerWidget
@@ -178,8 +179,9 @@ private:
     std::unique_ptr<ArchiveInitThread> mInitThread;
     bool mIgnoreLoaded = false; // a loader that is being ended may still deliver
     std::unique_ptr<ArchiveMenu> mMenu;
-    QList<Archive*> mArchives;     // owned
-    QList<ArchiveItem*> mAllItems; // listed or held by an undo command; children of the list
+    QList<Archive*> mArchives;                     // owned
+    std::unique_ptr<SmallPictures> mSmallPictures; // of the records, until all items have theirs
+    QList<ArchiveItem*> mAllItems;                 // listed or held by an undo command; children of the list
     std::unique_ptr<Archive> mCopyArchive;
     TitlePictures mCopyPictures;
     // The background of the copy, so that the canvas need not decode it when it is pasted.
