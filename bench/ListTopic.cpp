@@ -34,25 +34,12 @@ constexpr double FIRST_SCREEN_AIM = 0.15;
 constexpr int TITLES = 99;
 constexpr int TICK_PIXELS = 24; // of a brisk flick
 constexpr int CHARACTERS = 100;
-const QSize SMALL_PICTURE(240, 135);
-
-QStringList picturePaths(const QString& folder)
-{
-    QStringList paths;
-    for (const std::string& title : BenchTitles::writeFolder(folder.toStdString(), TITLES)) {
-        const QFileInfo info(QString::fromStdString(title));
-        paths.append(folder + QLatin1Char('/') + info.completeBaseName() + QStringLiteral("_240.png"));
-        QImage picture = BenchTitles::photograph(SMALL_PICTURE);
-        picture.save(paths.constLast());
-    }
-    return paths;
-}
 
 QString titleFolder(const BenchEnvironment& environment)
 {
     static const QString folder = [&environment] {
         const QString path = environment.makeFolder(QStringLiteral("list"));
-        picturePaths(path);
+        BenchTitles::writeIllustratedFolder(path.toStdString(), TITLES);
         return path;
     }();
     return folder;
