@@ -14,7 +14,9 @@ namespace
 
 constexpr int CHARACTERS_A_WORD = 6;
 constexpr int CHARACTERS_A_LINE = 40;
-constexpr int FIRST_NUMBER = 100; // of three digits
+constexpr int FIRST_NUMBER = 100;    // of three digits
+constexpr std::size_t EXTENSION = 4; // of ".xml"
+constexpr QSize SMALL_PICTURE(240, 135);
 constexpr int FOLDER_TITLE_CHARACTERS = 40;
 constexpr std::array COLORS = {"#FFFFFF", "#FFD24D", "#8FE3FF", "#FF6060"};
 constexpr std::u16string_view LETTERS = u"Breaking news from the coast 快讯速報 live at ten o'clock ";
@@ -114,6 +116,15 @@ std::vector<std::string> BenchTitles::writeFolder(const std::string& folder, int
         paths.push_back(archive.getPath());
     }
     parser.writeFileOrderInFolder(folder, rows);
+    return paths;
+}
+
+std::vector<std::string> BenchTitles::writeIllustratedFolder(const std::string& folder, int count, int texts)
+{
+    std::vector<std::string> paths = writeFolder(folder, count, texts);
+    const QImage picture = photograph(SMALL_PICTURE);
+    for (const std::string& path : paths)
+        picture.save(QString::fromStdString(path.substr(0, path.size() - EXTENSION) + "_240.png"));
     return paths;
 }
 

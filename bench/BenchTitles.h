@@ -31,6 +31,10 @@ public:
     // order.
     static std::vector<std::string> writeFolder(const std::string& folder, int count, int texts = TEXTS);
 
+    // The same with a small picture for each title.
+    static std::vector<std::string> writeIllustratedFolder(const std::string& folder, int count,
+                                                           int texts = TEXTS);
+
     // A picture that compresses as badly as a photograph does.
     static QImage photograph(QSize size);
 };

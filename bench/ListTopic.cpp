@@ -2,10 +2,9 @@
 #include "bench/BenchEnvironment.h"
 #include "bench/BenchTitles.h"
 #include "bench/PairList.h"
+#include "bench/ShownList.h"
+#include "bench/TitleEditor.h"
 #include "bench/Topics.h"
-#include "canvas/CanvasScene.h"
-#include "canvas/GraphicsView.h"
-#include "canvas/IThumbnailRender.h"
 #include "document/ArchiveController.h"
 #include "library/ArchiveItem.h"
 #include "library/ArchiveList.h"
@@ -20,7 +19,6 @@
 #include <QPushButton>
 #include <QScrollArea>
 #include <QScrollBar>
-#include <QUndoCommand>
 #include <QVBoxLayout>
 #include <memory>
 #include <vector>
@@ -32,37 +30,16 @@ constexpr double FLICK_AIM = 1.3;
 constexpr double BUILD_AIM = 2.0;
 constexpr double TAP_AIM = 1.5;
 constexpr double OPEN_AIM = 1.5;
+constexpr double FIRST_SCREEN_AIM = 0.15;
 constexpr int TITLES = 99;
 constexpr int TICK_PIXELS = 24; // of a brisk flick
 constexpr int CHARACTERS = 100;
-const QSize LIST_SIZE(549, 997);
-const QSize SMALL_PICTURE(240, 135);
-const QSize CANVAS(1280, 720);
-
-// What the program does at once: layouts, queued calls, updates and the paint events of the window.
-void show(QWidget& window)
-{
-    QCoreApplication::processEvents();
-    QCoreApplication::sendPostedEvents(&window, QEvent::UpdateRequest);
-}
-
-QStringList picturePaths(const QString& folder)
-{
-    QStringList paths;
-    for (const std::string& title : BenchTitles::writeFolder(folder.toStdString(), TITLES)) {
-        const QFileInfo info(QString::fromStdString(title));
-        paths.append(folder + QLatin1Char('/') + info.completeBaseName() + QStringLiteral("_240.png"));
-        QImage picture = BenchTitles::photograph(SMALL_PICTURE);
-        picture.save(paths.constLast());
-    }
-    return paths;
-}
 
 QString titleFolder(const BenchEnvironment& environment)
 {
     static const QString folder = [&environment] {
         const QString path = environment.makeFolder(QStringLiteral("list"));
-        picturePaths(path);
+        BenchTitles::writeIllustratedFolder(path.toStdString(), TITLES);
         return path;
     }();
     return folder;
@@ -75,31 +52,6 @@ QStringList smallPictures(const QString& folder)
         paths.append(folder + QLatin1Char('/') + name);
     return paths;
 }
-
-// The list of a window, with its label, that shows the folder.
-class ShownList
-{
-public:
-    ShownList() : list(&mLabel, false)
-    {
-        list.setFixedSize(LIST_SIZE);
-        list.show();
-        show(list);
-    }
-    void open(const QString& folder)
-    {
-        list.refreshArchiveList(folder);
-        while (list.count() > 0 && !list.archiveItem(list.count() - 1)->hasChildWidgets())
-            show(list);
-        show(list);
-    }
-
-private:
-    QLabel mLabel;
-
-public:
-    ArchiveList list;
-};
 
 void scrollTo(QScrollBar& bar, int& value, int& step)
 {
@@ -118,7 +70,7 @@ void flickList(benchmark::State& state, const QString& folder)
     for ([[maybe_unused]] auto _ : state) {
         scrollTo(bar, value, step);
         shown.list.slotSetScrollBarValue(value);
-        show(shown.list);
+        ShownList::show(shown.list);
     }
     if (bar.value() != value || shown.list.count() != TITLES)
         state.SkipWithError("the list did not scroll");
@@ -132,7 +84,7 @@ void scrollBareArea(benchmark::State& state, const QString& folder)
     area.setFrameShape(QFrame::NoFrame);
     area.setHorizontalScrollBarPolicy(Qt::ScrollBarAlwaysOff);
     area.setVerticalScrollBarPolicy(Qt::ScrollBarAlwaysOff);
-    area.setFixedSize(LIST_SIZE);
+    area.setFixedSize(shown.list.size());
     auto* board = new QWidget;
     auto* column = new QVBoxLayout(board);
     column->setContentsMargins(38, 0, 0, 0);
@@ -145,14 +97,14 @@ void scrollBareArea(benchmark::State& state, const QString& folder)
     }
     area.setWidget(board);
     area.show();
-    show(area);
+    ShownList::show(area);
     QScrollBar& bar = *area.verticalScrollBar();
     int value = 0;
     int step = TICK_PIXELS;
     for ([[maybe_unused]] auto _ : state) {
         scrollTo(bar, value, step);
         bar.setValue(value);
-        show(area);
+        ShownList::show(area);
     }
 }
 
@@ -192,74 +144,53 @@ void fillBareArea(benchmark::State& state)
 }
 
 // Two titles of four texts each, the list that selects them and the canvas that shows them.
-class Editor
+QString twoTitles(const BenchEnvironment& environment)
 {
-public:
-    explicit Editor(const BenchEnvironment& environment)
-        : view(&scene), mFolder(environment.makeFolder(QStringLiteral("tap")))
-    {
-        BenchTitles::writeFolder(mFolder.toStdString(), 2);
-        ArchiveController controller;
-        for (const QFileInfo& file : QDir(mFolder).entryInfoList({QStringLiteral("*.xml")}, QDir::Files)) {
-            Archive title = BenchTitles::title(file.filePath().toStdString(), CHARACTERS, 36);
-            controller.saveNewArchive(mFolder, &title);
-        }
-        scene.setSceneRect(QRectF(QPointF(0, 0), CANVAS));
-        view.setFrameShape(QFrame::NoFrame);
-        view.setHorizontalScrollBarPolicy(Qt::ScrollBarAlwaysOff);
-        view.setVerticalScrollBarPolicy(Qt::ScrollBarAlwaysOff);
-        view.resize(CANVAS);
-        view.show();
-        QObject::connect(&shown.list, &ArchiveList::signalUpdateCanvas, &scene,
-                         &CanvasScene::slotUpdateArchive);
-        QObject::connect(&shown.list, &ArchiveList::itemSetDefaultState, &scene,
-                         &CanvasScene::slotMakeSceneThumnail);
-        QObject::connect(&shown.list, &ArchiveList::focusCommandSignal, &shown.list,
-                         [](QUndoCommand* command) { delete command; });
-        shown.open(mFolder);
-        show(view);
+    const QString folder = environment.makeFolder(QStringLiteral("tap"));
+    BenchTitles::writeFolder(folder.toStdString(), 2);
+    ArchiveController controller;
+    for (const QFileInfo& file : QDir(folder).entryInfoList({QStringLiteral("*.xml")}, QDir::Files)) {
+        Archive title = BenchTitles::title(file.filePath().toStdString(), CHARACTERS, 36);
+        controller.saveNewArchive(folder, &title);
     }
-    bool isComplete() const { return shown.list.count() == 2 && scene.getTextItemList().size() == 4; }
-    void tap(int row)
-    {
-        QWidget* port = shown.list.viewport();
-        const QPointF pos(120, 143 * row + 60);
-        for (const QEvent::Type type : {QEvent::MouseButtonPress, QEvent::MouseButtonRelease}) {
-            QMouseEvent event(type, pos, port->mapToGlobal(pos), Qt::LeftButton, Qt::LeftButton,
-                              Qt::NoModifier);
-            QApplication::sendEvent(port, &event);
-        }
-        show(shown.list);
-        show(view);
+    return folder;
+}
+
+bool isComplete(const TitleEditor& editor)
+{
+    return editor.shown.list.count() == 2 && editor.scene.getTextItemList().size() == 4;
+}
+
+void tap(TitleEditor& editor, int row)
+{
+    QWidget* port = editor.shown.list.viewport();
+    const QPointF pos(120, 143 * row + 60);
+    for (const QEvent::Type type : {QEvent::MouseButtonPress, QEvent::MouseButtonRelease}) {
+        QMouseEvent event(type, pos, port->mapToGlobal(pos), Qt::LeftButton, Qt::LeftButton, Qt::NoModifier);
+        QApplication::sendEvent(port, &event);
     }
-
-    CanvasScene scene{nullptr};
-    GraphicsView view;
-    ShownList shown;
-
-private:
-    QString mFolder;
-};
+    editor.show();
+}
 
 void tapTitle(benchmark::State& state, const BenchEnvironment& environment)
 {
-    Editor editor(environment);
+    TitleEditor editor(twoTitles(environment), nullptr);
     int row = 0;
     for ([[maybe_unused]] auto _ : state) {
         row = 1 - row;
-        editor.tap(row);
+        tap(editor, row);
     }
-    if (!editor.isComplete() || editor.shown.list.getItemIndex(editor.shown.list.getSelectedArchive()) != row)
+    if (!isComplete(editor) || editor.shown.list.getItemIndex(editor.shown.list.getSelectedArchive()) != row)
         state.SkipWithError("the title was not selected");
 }
 
 // Every text is laid out and drawn once.
 void renderTitle(benchmark::State& state, const BenchEnvironment& environment)
 {
-    Editor editor(environment);
-    if (!editor.isComplete())
+    TitleEditor editor(twoTitles(environment), nullptr);
+    if (!isComplete(editor))
         state.SkipWithError("the title does not show");
-    QImage picture(CANVAS, QImage::Format_ARGB32_Premultiplied);
+    QImage picture(TitleEditor::CANVAS, QImage::Format_ARGB32_Premultiplied);
     for ([[maybe_unused]] auto _ : state) {
         picture.fill(Qt::transparent);
         QPainter painter(&picture);
@@ -308,7 +239,26 @@ private:
     bool mIsPainted = false;
 };
 
+void closeFolder(ShownList& shown)
+{
+    shown.list.cleanArchiveList();
+    ShownList::show(shown.list);
+}
+
 void openFolder(benchmark::State& state, const QString& folder)
+{
+    ShownList shown;
+    for ([[maybe_unused]] auto _ : state) {
+        shown.open(folder);
+        state.PauseTiming();
+        if (shown.list.count() != TITLES)
+            state.SkipWithError("the folder was not opened");
+        closeFolder(shown);
+        state.ResumeTiming();
+    }
+}
+
+void openFirstScreen(benchmark::State& state, const QString& folder)
 {
     ShownList shown;
     FirstScreen first(state, shown.list);
@@ -318,8 +268,7 @@ void openFolder(benchmark::State& state, const QString& folder)
         while (!first.isPainting())
             QCoreApplication::processEvents();
         first.end();
-        shown.list.cleanArchiveList();
-        show(shown.list);
+        closeFolder(shown);
         state.ResumeTiming();
     }
 }
@@ -350,4 +299,8 @@ void Topics::addList(PairList& list, const BenchEnvironment& environment)
         {"folder_open", OPEN_AIM, PairList::Clock::Wall}, benchmark::kMillisecond,
         [place](benchmark::State& state) { openFolder(state, titleFolder(*place)); },
         [place](benchmark::State& state) { decodePictures(state, smallPictures(titleFolder(*place))); });
+    list.add(
+        {"folder_first_screen", FIRST_SCREEN_AIM, PairList::Clock::Wall}, benchmark::kMillisecond,
+        [place](benchmark::State& state) { openFirstScreen(state, titleFolder(*place)); },
+        [place](benchmark::State& state) { openFolder(state, titleFolder(*place)); });
 }

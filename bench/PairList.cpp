@@ -6,6 +6,8 @@ void PairList::add(const Pair& pair, benchmark::TimeUnit unit, const Body& ours,
         auto* entry = benchmark::RegisterBenchmark((pair.name + side).c_str(), body)->Unit(unit);
         if (pair.clock == Clock::Wall)
             entry->UseRealTime();
+        else if (pair.clock == Clock::Step)
+            entry->UseManualTime();
     };
     enter("/ours", ours);
     enter("/floor", floor);

@@ -13,8 +13,9 @@ class PairList
 {
 public:
     // Which clock the ratio is taken from: of the measured thread, for work that waits for nothing, or of the
-    // wall, for work with files, threads or other processes.
-    enum class Clock { Cpu, Wall };
+    // wall, for work with files, threads or other processes. Step is the wall's, too, for the part of an
+    // iteration that the body itself has measured.
+    enum class Clock { Cpu, Wall, Step };
 
     struct Pair {
         std::string name;

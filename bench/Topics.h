@@ -12,6 +12,7 @@ void addFilter(PairList& list);
 void addList(PairList& list, const BenchEnvironment& environment);
 void addMessaging(PairList& list);
 void addPanel(PairList& list);
+void addPaste(PairList& list, const BenchEnvironment& environment);
 void addPictures(PairList& list, const BenchEnvironment& environment);
 void addRendering(PairList& list, const BenchEnvironment& environment);
 void addStart(PairList& list);

@@ -2,8 +2,9 @@
 //
 //   titler_bench                 all pairs, then their ratios
 //   titler_bench --strict        the same; the exit code is 1 when a pair misses its aim
-//   titler_bench --memory [N]    resident memory over N sessions (500) instead; takes a second or two for
-//   each titler_bench --benchmark_... as any Google Benchmark program
+//   titler_bench --memory [N]    resident memory over N sessions (500) instead
+//   titler_bench --memory-list   resident memory with a long folder in the list instead
+//   titler_bench --benchmark_... as any Google Benchmark program
 #include "bench/BenchEnvironment.h"
 #include "bench/BenchTitles.h"
 #include "bench/CallPeer.h"
@@ -32,10 +33,10 @@ int runRole(const char* role, int argc, char* argv[])
 }
 
 // The programs are driven by mouse and keys on a display, for which there is a script.
-int runMemory(const char* count)
+int runMemory(const char* argument)
 {
     const QByteArray build = QFileInfo(BenchEnvironment::binaryFolder()).path().toLocal8Bit();
-    execlp("python3", "python3", "-B", TITLER_MEMORY_SCRIPT, build.constData(), count, nullptr);
+    execlp("python3", "python3", "-B", TITLER_MEMORY_SCRIPT, build.constData(), argument, nullptr);
     std::perror("python3");
     return 2;
 }
@@ -44,7 +45,7 @@ int writeTitles(const char* folder, const char* count)
 {
     constexpr int TEXTS = 3; // leaves room for one more
     const int wanted = std::atoi(count);
-    return BenchTitles::writeFolder(folder, wanted, TEXTS).size() == static_cast<std::size_t>(wanted) ? 0 : 1;
+    return BenchTitles::writeIllustratedFolder(folder, wanted, TEXTS).size() == static_cast<std::size_t>(wanted) ? 0 : 1;
 }
 
 bool takeOption(std::vector<char*>& arguments, const char* option)
@@ -75,6 +76,7 @@ int runPairs(std::vector<char*> arguments, const BenchEnvironment& environment)
     Topics::addEditing(list);
     Topics::addTitleFiles(list, environment);
     Topics::addList(list, environment);
+    Topics::addPaste(list, environment);
     Topics::addFilter(list);
     Topics::addMessaging(list);
     Topics::addStart(list);
@@ -94,6 +96,8 @@ int main(int argc, char* argv[])
         return writeTitles(argv[2], argv[3]);
     if (argc >= 2 && std::strcmp(argv[1], "--memory") == 0)
         return runMemory(argc > 2 ? argv[2] : nullptr);
+    if (argc == 2 && std::strcmp(argv[1], "--memory-list") == 0)
+        return runMemory("--list");
     const std::vector<char*> arguments(argv, argv + argc);
     const BenchEnvironment environment;
     if (!environment.isValid())

@@ -1,5 +1,6 @@
 """Resident memory of the titler over many sessions, each of which opens a title, adds a text and saves it.
 
+With --list instead: with a long folder in the list.
 Runs the real programs on an X server of their own; started by titler_bench --memory. Needs Xvfb, openbox and xdotool.
 """
 import argparse
@@ -19,6 +20,9 @@ WARM_UP = 25  # sessions after which caches and fonts are filled
 TITLES_A_FOLDER = 90
 GROWTH_AIM = 2048  # kB
 TOTAL_AIM = 1.5
+LONG_FOLDER = 99
+SMALL_PICTURE = 240 * 135 * 4 / 1024  # kB, decoded
+LIST_AIM = 1.3
 NEW_TEXT = (810, 41)  # the middle of the buttons, in pixels of the screen
 CLOSE = (1850, 41)
 TOP_WINDOW_MAIN = 2
@@ -45,18 +49,22 @@ class Run:
             K2SYS_PORT_OFFSET=OFFSET)
         base = subprocess.run([self.program("titler_provision")], env=environment, check=True,
                               stdout=subprocess.PIPE, text=True).stdout.splitlines()[-1]
+        self.base = base
         self.paths = []
         while len(self.paths) < count:
-            titles = os.path.join(base, "resources", "Titles", f"Folder{len(self.paths)}")
-            os.makedirs(titles)
-            subprocess.run([self.program("titler_bench"), "--write-titles", titles, str(TITLES_A_FOLDER)], check=True)
-            self.paths += sorted(os.path.join(titles, name) for name in os.listdir(titles)
-                                 if name.endswith(".xml") and not name.startswith("."))
+            self.paths += self.write_titles(f"Folder{len(self.paths)}", TITLES_A_FOLDER)
         del self.paths[count:]
         self.folder = folder
         self.display = session.Display(os.path.join(folder, "x"), environment)
         self.environment = self.display.environment
         self.appliance = self.titler = None
+
+    def write_titles(self, folder, count):
+        titles = os.path.join(self.base, "resources", "Titles", folder)
+        os.makedirs(titles)
+        subprocess.run([self.program("titler_bench"), "--write-titles", titles, str(count)], check=True)
+        return sorted(os.path.join(titles, name) for name in os.listdir(titles)
+                      if name.endswith(".xml") and not name.startswith("."))
 
     def program(self, name):
         return os.path.join(self.build, "bin", name)
@@ -106,10 +114,15 @@ class Run:
         self.appliance.wait_for(lambda event: event.get("method") == "setTopWindow" and
                                 event["args"]["topWindow"] == TOP_WINDOW_MAIN, 20, start, "the end of the session")
 
-    def stop(self):
-        for process in (self.titler, self.appliance, self.display):
+    def stop_programs(self):
+        for process in (self.titler, self.appliance):
             if process:
                 process.stop()
+        self.titler = self.appliance = None
+
+    def stop(self):
+        self.stop_programs()
+        self.display.stop()
 
 
 def measure(run):
@@ -142,15 +155,46 @@ def measure(run):
     return growth <= GROWTH_AIM and opened[0] <= TOTAL_AIM * bare
 
 
+def settled(run):
+    """Resident memory once it no longer changes."""
+    last = []
+
+    def is_same():
+        last.append(resident(run.titler.pid))
+        return len(last) > 5 and len(set(last[-5:])) == 1
+
+    session.wait_until(is_same, 30, "the memory to settle")
+    return last[-1]
+
+
+def measure_list(run):
+    """A process of its own for each side; the same title is on the canvas of both."""
+    sizes = []
+    for folder, count in (("Short", 1), ("Long", LONG_FOLDER)):
+        paths = run.write_titles(folder, count)
+        run.start()
+        run.open(paths[0])
+        sizes.append(settled(run))
+        print(f"{count} in the list: {sizes[-1][0]} kB, of it {sizes[-1][1]} kB of its own", flush=True)
+        run.stop_programs()
+    floor = sizes[0][0] + (LONG_FOLDER - 1) * SMALL_PICTURE
+    ratio = sizes[1][0] / floor
+    print(f"with {LONG_FOLDER}: {ratio:.2f} of one and the pictures of the others, {floor:.0f} kB (aim {LIST_AIM})")
+    grown = (sizes[1][0] - sizes[0][0]) / (LONG_FOLDER - 1)
+    print(f"a title in the list: {grown:.0f} kB, its decoded picture {SMALL_PICTURE:.0f}")
+    return ratio <= LIST_AIM
+
+
 def main():
     parser = argparse.ArgumentParser(description=__doc__)
     parser.add_argument("build")
     parser.add_argument("count", nargs="?", type=int, default=500)
+    parser.add_argument("--list", action="store_true")
     options = parser.parse_args()
     with tempfile.TemporaryDirectory(prefix="titler-") as folder:
-        run = Run(options.build, folder, options.count)
+        run = Run(options.build, folder, 0 if options.list else options.count)
         try:
-            return 0 if measure(run) else 1
+            return 0 if (measure_list(run) if options.list else measure(run)) else 1
         except session.SessionError as error:
             print(f"memory: {error}", file=sys.stderr)
             return 2

@@ -126,6 +126,7 @@ bool CanvasScene::archiveIsNull(const Archive* archive)
 
 void CanvasScene::slotUpdateArchive(const Archive* archive)
 {
+    const auto previous = m_currentPixmapItem ? m_currentPixmapItem->source() : nullptr; // a paste shares it
     savePreviousArchiveInfo();
     // A text that was being typed until now is in no picture yet.
     if (m_archive && (!archive || archive->getPath() != m_archive->getPath()))
@@ -141,8 +142,7 @@ void CanvasScene::slotUpdateArchive(const Archive* archive)
         addCGraphicsPixmapItem(background, QPointF(m_archive->getBgPointX(), m_archive->getBgPointY()),
                                m_archive->getBgPointZ());
     }
-    const std::vector<TText*> records = m_archive->getText();
-    for (TText* record : records) {
+    for (TText* record : m_archive->getText()) {
         if (record)
             buildPair(record);
     }

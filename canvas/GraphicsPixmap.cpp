@@ -1,27 +1,18 @@
 #include "canvas/GraphicsPixmap.h"
 
-#include <QFileInfo>
-#include <QImageReader>
+#include "canvas/BackgroundPicture.h"
+
 #include <QPainter>
 
-namespace
+GraphicsPixmap::GraphicsPixmap(const QString& path, QGraphicsItem* parent)
+    : GraphicsPixmap(path, QPixmap(), parent)
 {
-
-// Opening a pipe waits until somebody writes to it, and a device may never end. Read past the application's
-// cache of pictures: a background is of no more use once its title is off the canvas, and four megabytes
-// large.
-QPixmap readPicture(const QString& path)
-{
-    if (!QFileInfo(path).isFile())
-        return {};
-    QImageReader reader(path);
-    return QPixmap::fromImageReader(&reader);
+    m_source = BackgroundPicture::load(path);
+    setPixmap(m_source->pixmap());
 }
 
-} // namespace
-
-GraphicsPixmap::GraphicsPixmap(const QString& path, QGraphicsItem* parent)
-    : QGraphicsPixmapItem(readPicture(path), parent), m_path(path)
+GraphicsPixmap::GraphicsPixmap(const QString& path, const QPixmap& picture, QGraphicsItem* parent)
+    : QGraphicsPixmapItem(picture, parent), m_path(path)
 {
     setFlag(ItemIsMovable, false);
     setFlag(ItemIsSelectable, true);

@@ -2,6 +2,9 @@
 
 #include <QGraphicsPixmapItem>
 #include <QString>
+#include <memory>
+
+class BackgroundPicture;
 
 // Background picture of a title: selectable, never movable, painted without a selection frame.
 class GraphicsPixmap : public QGraphicsPixmapItem
@@ -12,6 +15,11 @@ public:
     // Loads the picture at path; one that cannot be read gives an empty item.
     explicit GraphicsPixmap(const QString& path, QGraphicsItem* parent = nullptr);
 
+    // Shows the given picture of the file at path.
+    GraphicsPixmap(const QString& path, const QPixmap& picture, QGraphicsItem* parent = nullptr);
+
+    // What was loaded, also when another pixmap is shown by now; null without a load.
+    std::shared_ptr<const BackgroundPicture> source() const { return m_source; }
     QString getPixmapPath() const { return m_path; }
 
     int type() const override { return Type; }
@@ -20,4 +28,5 @@ public:
 
 private:
     QString m_path;
+    std::shared_ptr<const BackgroundPicture> m_source;
 };

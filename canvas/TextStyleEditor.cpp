@@ -68,6 +68,12 @@ void TextStyleEditor::insertRecord()
     cursor.beginEditBlock();
     cursor.select(QTextCursor::Document);
     cursor.removeSelectedText();
+    // Texts of a title often have the same height: with the last one's margins, the text that comes now need
+    // not be laid out again for its own.
+    QTextBlockFormat format = cursor.blockFormat();
+    format.setLeftMargin(BOUNDING_RECT_EXPAND_REGION_FOR_HANDLE);
+    format.setRightMargin(BOUNDING_RECT_EXPAND_REGION_FOR_HANDLE);
+    cursor.setBlockFormat(format);
     for (int begin = 0; begin < m_styles.count();) {
         QString text;
         TextStyle& first = *m_styles.at(begin);

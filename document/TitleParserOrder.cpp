@@ -6,8 +6,12 @@
 #include "document/TitleParserUtility.h"
 #include "support/XmlFile.h"
 
+#include <algorithm>
+#include <atomic>
 #include <cstdio>
+#include <future>
 #include <memory>
+#include <thread>
 #include <tinyxml.h>
 
 namespace
@@ -19,6 +23,25 @@ constexpr std::size_t EXTENSION_LENGTH = 4; // of ".xml"
 bool readInt(const TiXmlElement& element, const char* key, int& value)
 {
     return element.QueryIntAttribute(key, &value) == TIXML_SUCCESS;
+}
+
+// Calls job(0) to job(count - 1), each once, and returns when all are done. The calling thread takes part.
+template <typename Job>
+void onAllCores(std::size_t count, const Job& job)
+{
+    constexpr std::size_t WORTH_A_THREAD = 8;
+    std::atomic<std::size_t> next = 0;
+    const auto work = [&] {
+        for (std::size_t k = next++; k < count; k = next++)
+            job(k);
+    };
+    const std::size_t cores = std::max(std::thread::hardware_concurrency(), 1U);
+    std::vector<std::future<void>> helpers;
+    for (std::size_t i = 1; i < std::min(cores, count / WORTH_A_THREAD); ++i)
+        helpers.push_back(std::async(std::launch::async, work));
+    work();
+    for (std::future<void>& helper : helpers)
+        helper.get();
 }
 
 } // namespace
@@ -63,7 +86,8 @@ int TitleParser::writeFileOrderInFolder(std::string folder, std::vector<ArchiveO
     // the start makes a new one for it from what the folder holds.
     const std::string path = folder + STR_SLASH + ORDER_FILEPATH;
     std::remove(path.c_str());
-    XmlFile::saveInPlace(document, path);
+    if (!XmlFile::saveInPlace(document, path))
+        std::remove(path.c_str());
     return 1;
 }
 
@@ -81,15 +105,21 @@ std::vector<Archive*> TitleParser::getFilsByOrderInFolder(std::string folder)
             name.erase(name.size() - EXTENSION_LENGTH);
             archive->setName(std::move(name));
             archive->setOrder(std::to_string(k + 1));
-            if (readOneTitle(folder + STR_SLASH + path, archive.get()) < 1)
-                continue;
         }
         titles.push_back(std::move(archive));
     }
+    // Each is read on its own; a row without a path makes an empty title.
+    onAllCores(titles.size(), [&](std::size_t k) {
+        const std::string& path = rows[k]->getArchivePath();
+        if (!path.empty() && TitleParser().readOneTitle(folder + STR_SLASH + path, titles[k].get()) < 1)
+            titles[k].reset();
+    });
     std::vector<Archive*> result;
     result.reserve(titles.size());
-    for (std::unique_ptr<Archive>& title : titles)
-        result.push_back(title.release());
+    for (std::unique_ptr<Archive>& title : titles) {
+        if (title)
+            result.push_back(title.release());
+    }
     return result;
 }
 

@@ -2,21 +2,22 @@
 
 #include "document/Archive.h"
 #include "document/TText.h"
+#include "library/SmallPictures.h"
 
 #include <QBrush>
-#include <QFileInfo>
 #include <QFontMetrics>
 #include <QGraphicsPixmapItem>
 #include <QGraphicsScene>
 #include <QGraphicsView>
-#include <QImageReader>
 #include <QLabel>
 #include <QPainter>
 #include <QPixmap>
+#include <QPixmapCache>
 #include <QTextLayout>
 #include <QtMath>
 #include <algorithm>
 
+const QSize ArchiveItem::PICTURE_SIZE(LEFT_CHILD_WIDTH, CHILD_HEIGHT);
 const QPoint ArchiveItem::LEFT_CHILD_POS(3, 2);
 const QPoint ArchiveItem::RIGHT_CHILD_POS(250, 2);
 QString ArchiveItem::SYSTEM_FONT_FAMILY = QStringLiteral("KST");
@@ -39,18 +40,30 @@ const int NARROW_LABEL_WIDTH = 250;
 const int NARROW_LABEL_HEIGHT = 24;
 const int CHECKER_SQUARE = 8; // pixels
 
-QBrush checkerBrush()
+QPixmap checkerPicture()
 {
     const QPixmap checker(QStringLiteral(":/checker"));
     if (!checker.isNull())
-        return QBrush(checker);
+        return checker;
     // Without the picture collection transparency still has to be told from black.
     QPixmap drawn(2 * CHECKER_SQUARE, 2 * CHECKER_SQUARE);
     drawn.fill(QColor(102, 102, 102));
     QPainter painter(&drawn);
     painter.fillRect(0, 0, CHECKER_SQUARE, CHECKER_SQUARE, QColor(153, 153, 153));
     painter.fillRect(CHECKER_SQUARE, CHECKER_SQUARE, CHECKER_SQUARE, CHECKER_SQUARE, QColor(153, 153, 153));
-    return QBrush(drawn);
+    return drawn;
+}
+
+// One for all items: finding the picture among the resources takes longer than painting it.
+QBrush checkerBrush()
+{
+    const QString key = QStringLiteral("ArchiveItem checker");
+    QPixmap checker;
+    if (!QPixmapCache::find(key, &checker)) {
+        checker = checkerPicture();
+        QPixmapCache::insert(key, checker);
+    }
+    return QBrush(checker);
 }
 
 } // namespace
@@ -85,14 +98,14 @@ void ArchiveItem::updateArchiveData(Archive* archive)
     mArchive->setName(name);
 }
 
-void ArchiveItem::initArchiveItemChildWidget()
+void ArchiveItem::initArchiveItemChildWidget(const QImage& picture)
 {
     if (hasChildWidgets())
         return;
     if (mType == LIST_ITEM)
         createLeftChild();
     createRightChild();
-    updateLeftChild(QImage());
+    updateLeftChild(picture);
     updateRightChild();
     if (hasDragFlag())
         setDragFlag(true); // over the new children
@@ -103,9 +116,11 @@ void ArchiveItem::createLeftChild()
     mScene = new QGraphicsScene(0, 0, LEFT_CHILD_WIDTH, CHILD_HEIGHT, this);
     mScene->setBackgroundBrush(checkerBrush());
     mPixmapItem = mScene->addPixmap(QPixmap());
-    auto* view = new QGraphicsView(mScene);
-    view->setEnabled(false);
+    // Within the item from the start, and its rule before the parts of the view: widgets that change their
+    // parent are styled anew, and their parts with them.
+    auto* view = new QGraphicsView(mScene, this);
     view->setStyleSheet(QStringLiteral("border:0;"));
+    view->setEnabled(false);
     view->setHorizontalScrollBarPolicy(Qt::ScrollBarAlwaysOff);
     view->setVerticalScrollBarPolicy(Qt::ScrollBarAlwaysOff);
     view->setFixedSize(LEFT_CHILD_WIDTH, CHILD_HEIGHT);
@@ -117,7 +132,7 @@ void ArchiveItem::createLeftChild()
 void ArchiveItem::createRightChild()
 {
     const bool narrow = mType == NARROW_ITEM;
-    mTextWidget = new QWidget;
+    mTextWidget = new QWidget(this);
     setChild(mTextWidget, CHILD_RIGHT);
     mTextWidget->setObjectName(QStringLiteral("mTextWidget"));
     if (narrow)
@@ -149,14 +164,10 @@ void ArchiveItem::updateLeftChild(QImage image)
 {
     if (!mPixmapItem || !mArchive)
         return;
-    if (image.isNull()) {
-        const QString path = mArchive->getFullPathOfThumbnailSmall();
-        if (QFileInfo(path).isFile()) // a pipe would be waited for
-            image = QImageReader(path).read();
-    }
-    // A picture of foreign making may be of any size; what does not fit would only cost memory.
-    if (image.width() > LEFT_CHILD_WIDTH || image.height() > CHILD_HEIGHT)
-        image = image.scaled(LEFT_CHILD_WIDTH, CHILD_HEIGHT, Qt::KeepAspectRatio, Qt::SmoothTransformation);
+    if (image.isNull())
+        image = SmallPictures::read(mArchive->getFullPathOfThumbnailSmall(), PICTURE_SIZE);
+    else
+        image = SmallPictures::fitted(image, PICTURE_SIZE);
     mPixmapItem->setPixmap(image.isNull() ? QPixmap() : QPixmap::fromImage(image));
 }
 

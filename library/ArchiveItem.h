@@ -29,6 +29,7 @@ public:
     static const int DISPLY_TEXT_SIZE = 28; // pixels
     static const int DISPLY_TEXT_SIZE_LENTH = 254;
     static const int LEFT_CHILD_LABEL_COUNT = 4;
+    static const QSize PICTURE_SIZE; // of the left child
     static const QPoint LEFT_CHILD_POS;
     static const QPoint RIGHT_CHILD_POS;
 
@@ -53,9 +54,9 @@ public:
     // Takes over the contents of the given record; the name that the item's record has is kept.
     void updateArchiveData(Archive* archive);
 
-    // Builds the thumbnail and the text lines. Costs a picture file, so the list does it once it is on
-    // screen.
-    void initArchiveItemChildWidget();
+    // Builds the thumbnail and the text lines. Without a picture it costs a picture file, so the list does it
+    // once it is on screen.
+    void initArchiveItemChildWidget(const QImage& picture = QImage());
     bool hasChildWidgets() const { return mTextWidget != nullptr; }
 
     void updateContents(QImage image);

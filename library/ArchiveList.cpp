@@ -4,17 +4,20 @@
 #include "document/ArchiveController.h"
 #include "document/ArchiveManager.h"
 #include "document/ArchiveOrder.h"
+#include "document/TitleParser.h"
 #include "library/ArchiveInitThread.h"
 #include "library/ArchiveItem.h"
 #include "library/ArchiveMenu.h"
 #include "library/FocusArchiveCommand.h"
 #include "library/ITitlerFolderReporter.h"
+#include "library/SmallPictures.h"
 #include "support/LeftoverSweep.h"
 #include "support/LogManager.h"
 
 #include <QCoreApplication>
 #include <QDir>
 #include <QEvent>
+#include <QFile>
 #include <QFileInfo>
 #include <QLabel>
 #include <string>
@@ -148,6 +151,10 @@ void ArchiveList::getArchiveListSuccessed(QList<Archive*> archivesList)
 void ArchiveList::addRecords(const QList<Archive*>& archives)
 {
     mArchives = archives;
+    QStringList pictures;
+    for (const Archive* archive : mArchives)
+        pictures.append(archive->getFullPathOfThumbnailSmall());
+    mSmallPictures = std::make_unique<SmallPictures>(pictures, ArchiveItem::PICTURE_SIZE);
     QList<KSBaseItemWidget*> items;
     for (Archive* archive : mArchives)
         items.append(createBaseItem(archive));
@@ -178,9 +185,14 @@ void ArchiveList::slotAddArchiveData()
 void ArchiveList::slotAddOneArchiveData(ArchiveItem* item)
 {
     // The folder may have changed while the call was queued.
-    if (!mAllItems.contains(item))
+    const qsizetype index = mAllItems.indexOf(item);
+    if (index < 0)
         return;
-    item->initArchiveItemChildWidget();
+    // The first items are those of the records, in their order.
+    if (!item->hasChildWidgets())
+        item->initArchiveItemChildWidget(mSmallPictures ? mSmallPictures->take(index) : QImage());
+    if (mSmallPictures && index + 1 == mSmallPictures->count())
+        mSmallPictures.reset();
     // Queued calls come before updates: what is on screen does not wait for the rest of a long folder.
     if (getItemIndex(item) == lastVisibleItem())
         viewport()->repaint();
@@ -382,6 +394,7 @@ void ArchiveList::setMainScene(CanvasScene* mainScene)
 void ArchiveList::clearOldArchiveList()
 {
     removeAll();
+    mSmallPictures.reset();
     // Those that undo commands still hold, too: the commands see it. The touch that leads here may be on its
     // way to another finger's item, which must be there to get it.
     for (ArchiveItem* item : std::as_const(mAllItems))
@@ -417,6 +430,13 @@ void ArchiveList::cleanArchiveList()
 
 void ArchiveList::synchronizationFolderFile()
 {
-    if (!mCurrentPath.isEmpty())
+    if (mCurrentPath.isEmpty())
+        return;
+    // Without an order, which a full disk did not take, the clean-up would count every title as deleted. The
+    // next start makes one from what the folder holds.
+    const QString order = mCurrentPath + QLatin1Char('/') + QLatin1String(TitleParser::ORDER_FILEPATH);
+    if (!isEmpty() && !QFile::exists(order))
+        saveArchiveListOrder();
+    if (QFile::exists(order))
         mController->deleteUnusefulArchives(mCurrentPath);
 }

@@ -7,6 +7,7 @@
 // only.
 #pragma once
 
+#include "canvas/BackgroundPicture.h"
 #include "document/Archive.h"
 #include "library/TitleFileOperations.h"
 #include "touchui/KSScrollViewerWidget.h"
@@ -16,6 +17,7 @@
 #include <QList>
 #include <QPointer>
 #include <QString>
+#include <future>
 #include <memory>
 
 class ArchiveController;
@@ -27,6 +29,7 @@ class CanvasScene;
 class ITitlerAPPEventFilterController;
 class QAction;
 class QLabel;
+class SmallPictures;
 class QUndoCommand;
 
 class ArchiveList : public KSScrollViewerWidget
@@ -152,6 +155,7 @@ private:
     void endInitThread();
     void openFolder(const QString& path);
     void clearOldArchiveList();
+    void decodeCopyBackground();
     void resetPositions();
     void setFolderLabel();
     void addRecords(const QList<Archive*>& archives);
@@ -175,10 +179,14 @@ private:
     std::unique_ptr<ArchiveInitThread> mInitThread;
     bool mIgnoreLoaded = false; // a loader that is being ended may still deliver
     std::unique_ptr<ArchiveMenu> mMenu;
-    QList<Archive*> mArchives;     // owned
-    QList<ArchiveItem*> mAllItems; // listed or held by an undo command; children of the list
+    QList<Archive*> mArchives;                     // owned
+    std::unique_ptr<SmallPictures> mSmallPictures; // of the records, until all items have theirs
+    QList<ArchiveItem*> mAllItems;                 // listed or held by an undo command; children of the list
     std::unique_ptr<Archive> mCopyArchive;
     TitlePictures mCopyPictures;
+    // The background of the copy, so that the canvas need not decode it when it is pasted.
+    std::future<BackgroundPicture::Decoded> mCopyDecoder;
+    std::shared_ptr<const BackgroundPicture> mCopyBackground;
     QLabel* mFolderLabel;
     CanvasScene* mMainScene = nullptr;
     QPointer<ITitlerAPPEventFilterController> mEventController;

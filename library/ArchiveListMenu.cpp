@@ -209,6 +209,18 @@ void ArchiveList::clearCopyArchive()
 {
     mCopyArchive.reset();
     mCopyPictures = TitlePictures();
+    mCopyDecoder = {};
+    mCopyBackground.reset();
+}
+
+void ArchiveList::decodeCopyBackground()
+{
+    const QString path = mCopyArchive->getFullPathOfBgResource();
+    if (path.isEmpty())
+        return;
+    mCopyBackground = BackgroundPicture::find(path);
+    if (!mCopyBackground)
+        mCopyDecoder = std::async(std::launch::async, [path] { return BackgroundPicture::decode(path); });
 }
 
 void ArchiveList::exeCopyArchive()
@@ -218,6 +230,7 @@ void ArchiveList::exeCopyArchive()
     clearCopyArchive();
     mCopyArchive = std::make_unique<Archive>(*mOperationItem->getArchiveData());
     mCopyPictures = TitleFileOperations::loadPictures(*mCopyArchive);
+    decodeCopyBackground();
     setOperationItemState(mOperationItem); // the border stays on
 }
 
@@ -236,6 +249,8 @@ void ArchiveList::exePasteArchive()
     std::unique_ptr<Archive> archive = mFiles.createFromCopy(mCurrentPath, *mCopyArchive, mCopyPictures);
     if (!archive)
         return;
+    if (mCopyDecoder.valid())
+        mCopyBackground = BackgroundPicture::load(mCopyDecoder.get());
     emitPasteCommand(std::move(archive));
     emit signalStartPasteArchive();
 }

@@ -1,5 +1,6 @@
 #include "library/ThumbnailRender.h"
 
+#include "canvas/BackgroundPicture.h"
 #include "canvas/GraphicsPixmap.h"
 #include "canvas/GraphicsText.h"
 #include "document/Archive.h"
@@ -62,6 +63,7 @@ ThumbnailRender::ThumbnailRender(QObject* parent) : IThumbnailRender(parent)
 
 ThumbnailRender::~ThumbnailRender()
 {
+    mBigPictures.clear(); // waits for their decoders
     clearMiddleSizeCanvasScene();
     clearBigSizeCanvasScene();
 }
@@ -78,6 +80,8 @@ void ThumbnailRender::makeThumbnail(const Archive* archive, bool bigSize)
 
 bool ThumbnailRender::makePictureThreadIsFinished()
 {
+    while (!mBigPictures.empty())
+        drawNextBigPicture();
     return mPictureThread.isThreadWaiting();
 }
 
@@ -138,8 +142,45 @@ void ThumbnailRender::clearMiddleSizeCanvasScene()
 void ThumbnailRender::makeBigSizeThumbnail(const Archive& archive)
 {
     deleteOldFile(archive);
-    createBigSizeCanvasSceneUsingArchiveData(archive);
-    saveBigSizeThumnail(archive, renderBigAndMiddleSizeCanvasScene());
+    auto job = std::make_unique<BigPicture>();
+    job->archive = std::make_unique<Archive>(archive);
+    job->hadTitle = QFile::exists(QString::fromStdString(archive.getPath()));
+    const QString background = archive.getFullPathOfBgResourceBig();
+    const auto announce = [this, job = job.get()] {
+        job->isDecoded = true;
+        QMetaObject::invokeMethod(this, &ThumbnailRender::drawDecodedBigPictures, Qt::QueuedConnection);
+    };
+    if (background.isEmpty()) {
+        announce();
+    } else {
+        job->decoder = std::async(std::launch::async, [job = job.get(), background, announce] {
+            job->background = BackgroundPicture::read(background);
+            announce();
+        });
+    }
+    mBigPictures.push_back(std::move(job));
+}
+
+// A background of 1920x1080 takes as long to decode as the texts take to draw, or longer.
+void ThumbnailRender::drawDecodedBigPictures()
+{
+    if (!mBigPictures.empty() && mBigPictures.front()->isDecoded)
+        drawNextBigPicture();
+    // One a turn of the event loop.
+    if (!mBigPictures.empty() && mBigPictures.front()->isDecoded)
+        QMetaObject::invokeMethod(this, &ThumbnailRender::drawDecodedBigPictures, Qt::QueuedConnection);
+}
+
+void ThumbnailRender::drawNextBigPicture()
+{
+    const std::unique_ptr<BigPicture> job = std::move(mBigPictures.front());
+    mBigPictures.pop_front();
+    if (job->decoder.valid())
+        job->decoder.wait();
+    if (job->hadTitle && !QFile::exists(QString::fromStdString(job->archive->getPath())))
+        return; // deleted meanwhile, with its pictures
+    createBigSizeCanvasSceneUsingArchiveData(*job->archive, job->background);
+    saveBigSizeThumnail(*job->archive, renderBigAndMiddleSizeCanvasScene());
     clearBigSizeCanvasScene();
 }
 
@@ -151,9 +192,10 @@ void ThumbnailRender::deleteOldFile(const Archive& archive)
         file.remove();
 }
 
-void ThumbnailRender::createBigSizeCanvasSceneUsingArchiveData(const Archive& archive)
+void ThumbnailRender::createBigSizeCanvasSceneUsingArchiveData(const Archive& archive,
+                                                               const QImage& background)
 {
-    mBigBackground = new GraphicsPixmap(archive.getFullPathOfBgResourceBig());
+    mBigBackground = new GraphicsPixmap(archive.getFullPathOfBgResourceBig(), QPixmap::fromImage(background));
     mBigScene.addItem(mBigBackground);
     mBigBackground->setPos(0, 0);
     mBigBackground->setZValue(archive.getBgPointZ());

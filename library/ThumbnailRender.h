@@ -14,6 +14,10 @@
 #include <QList>
 #include <QRect>
 #include <QSize>
+#include <atomic>
+#include <deque>
+#include <future>
+#include <memory>
 
 class Archive;
 class GraphicsPixmap;
@@ -38,9 +42,11 @@ public:
     ~ThumbnailRender() override;
 
     // False: the fast stage, which ends in saveHalfThumbnailsOK. True: the slow stage, which queues the
-    // files. Null does nothing. The record is only read.
+    // files: the background is decoded by another thread, and the picture drawn in a later turn of the event
+    // loop. Null does nothing. The record is only read.
     void makeThumbnail(const Archive* archive, bool bigSize) override;
-    // True when every queued picture has been written.
+    // True when every queued picture has been written. What is still to be drawn is drawn first, so that
+    // callers may wait without an event loop.
     bool makePictureThreadIsFinished() override;
 
     // Hooks for what a subclass may keep beside the scenes.
@@ -51,7 +57,9 @@ private:
     void makeMiddleAndSmallSizeThumbnail(const Archive& archive);
     void makeBigSizeThumbnail(const Archive& archive);
     void createMiddleSizeCanvasSceneUsingArchiveData(const Archive& archive);
-    void createBigSizeCanvasSceneUsingArchiveData(const Archive& archive);
+    void createBigSizeCanvasSceneUsingArchiveData(const Archive& archive, const QImage& background);
+    void drawDecodedBigPictures();
+    void drawNextBigPicture();
     QImage renderMiddleSizeCanvasScene();
     QList<QImage> renderBigAndMiddleSizeCanvasScene();
     static void deleteOldFile(const Archive& archive);
@@ -60,6 +68,16 @@ private:
     void clearMiddleSizeCanvasScene();
     void clearBigSizeCanvasScene();
 
+    // A title whose big picture is to be drawn once its background is decoded.
+    struct BigPicture {
+        std::unique_ptr<Archive> archive;
+        bool hadTitle = false; // whether there was a title file when the job was queued
+        QImage background;
+        std::atomic<bool> isDecoded = false; // the background may be used
+        std::future<void> decoder;
+    };
+
+    std::deque<std::unique_ptr<BigPicture>> mBigPictures;
     QList<GraphicsText*> mTexts; // of the last fast layout, owned by its scene
     QGraphicsScene mMiddleScene;
     QGraphicsScene mBigScene;

@@ -10,6 +10,7 @@
 #include <QDir>
 #include <QFile>
 #include <QFileInfo>
+#include <future>
 
 const QString TitleFileOperations::TIME_FORMATE = QStringLiteral("yyyyMMddhhmmsszzz");
 const QString TitleFileOperations::THUMBNAIL_BIG = QStringLiteral("_1920.png");
@@ -47,7 +48,16 @@ void writePicture(const Archive& archive, const std::string& name, const QByteAr
 {
     if (!name.empty() && !bytes.isEmpty())
         AtomicFile::write(pictureOf(archive, name).toStdString(),
-                          {bytes.constData(), static_cast<std::size_t>(bytes.size())});
+                          {bytes.constData(), static_cast<std::size_t>(bytes.size())},
+                          AtomicFile::Durability::SyncLater);
+}
+
+void writePictures(const Archive& archive, const TitlePictures& pictures)
+{
+    writePicture(archive, archive.getThumbnailBig(), pictures.big);
+    writePicture(archive, archive.getThumbnailSmall(), pictures.small);
+    writePicture(archive, archive.getThumbnailMiddle(), pictures.middle);
+    writePicture(archive, archive.getThumbnailBlack(), pictures.black);
 }
 
 // From the last "." on; empty when there is none.
@@ -139,14 +149,14 @@ std::unique_ptr<Archive> TitleFileOperations::createFromCopy(const QString& fold
         return nullptr;
     auto archive = std::make_unique<Archive>(copy);
     renameRecord(*archive, folder);
-    writePicture(*archive, archive->getThumbnailBig(), pictures.big);
-    writePicture(*archive, archive->getThumbnailSmall(), pictures.small);
-    writePicture(*archive, archive->getThumbnailMiddle(), pictures.middle);
-    writePicture(*archive, archive->getThumbnailBlack(), pictures.black);
+    // A photograph's files are several megabytes each; another core takes half of them.
+    const std::future<void> written =
+        std::async(std::launch::async, [&] { writePictures(*archive, pictures); });
     if (hasOwnBackground(copy)) {
         Archive from(copy);
         mController.copyArchiveBg(&from, archive.get());
     }
+    written.wait();
     if (!mController.saveNewArchive(folder, archive.get()))
         return nullptr;
     return archive;

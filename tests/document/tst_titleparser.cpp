@@ -501,6 +501,36 @@ private slots:
         }
     }
 
+    // Of so many each core reads some.
+    void titlesOfALongFolderInOrder()
+    {
+        constexpr int ROWS = 99;
+        std::vector<ArchiveOrder> rows;
+        std::vector<std::string> wanted;
+        for (int i = ROWS; i > 0; --i) {
+            const std::string name = "title" + std::to_string(i);
+            rows.push_back(row(ROWS - i, (name + ".xml").c_str()));
+            if (i % 7 == 0)
+                continue; // missing
+            if (i % 5 == 0) {
+                write((name + ".xml").c_str(), "<torn");
+                continue;
+            }
+            const auto archive = richTitle(path((name + ".xml").c_str()));
+            mParser.writeOneTitle(archive.get());
+            wanted.push_back(name + " at " + std::to_string(ROWS - i + 1));
+        }
+        mParser.writeFileOrderInFolder(folder(), rows);
+        std::vector<std::string> found;
+        const auto titles = mParser.getFilsByOrderInFolder(folder());
+        for (const Archive* title : titles) {
+            QCOMPARE(title->getText().size(), std::size_t(3));
+            found.push_back(title->getName() + " at " + title->getOrder());
+        }
+        QCOMPARE(found, wanted);
+        qDeleteAll(titles);
+    }
+
     void templateRowsPointIntoFolders()
     {
         QVERIFY(QDir(mFolder->path()).mkdir("UserTemplate_001"));

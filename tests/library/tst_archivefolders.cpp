@@ -6,7 +6,9 @@
 #include <QGraphicsView>
 #include <QSet>
 #include <QSignalSpy>
+#include <csignal>
 #include <functional>
+#include <sys/resource.h>
 #include <unistd.h>
 
 using Names = QStringList;
@@ -33,6 +35,23 @@ void cutInHalf(const QString& path)
     const QByteArray bytes = read(path);
     write(path, bytes.left(bytes.size() / 2));
 }
+
+// A disk that takes no more bytes, as the limit on the size of files makes it.
+class FullDisk
+{
+public:
+    FullDisk()
+    {
+        ::signal(SIGXFSZ, SIG_IGN);
+        ::getrlimit(RLIMIT_FSIZE, &mLimit);
+        const rlimit full = {0, mLimit.rlim_max};
+        ::setrlimit(RLIMIT_FSIZE, &full);
+    }
+    ~FullDisk() { ::setrlimit(RLIMIT_FSIZE, &mLimit); }
+
+private:
+    rlimit mLimit = {};
+};
 
 // Takes the rights to the folder away, from the superuser, too, who has them in spite of the mode.
 class Unreadable
@@ -73,6 +92,7 @@ private slots:
     void orderFiles_data();
     void orderFiles();
     void folderWithoutAnOrderGetsOneAtTheStart();
+    void orderThatDoesNotFitCostsNoTitle();
     void skippedTitlesLeaveTheOrderAtTheNextChange();
     void unreadableFolder();
     void unwritableFolderMakesNoTitle();
@@ -188,6 +208,36 @@ void tst_ArchiveFolders::folderWithoutAnOrderGetsOneAtTheStart()
     Names stems = m->stems();
     stems.sort();
     QCOMPARE(stems, (Names{"a", "b", "c"}));
+}
+
+void tst_ArchiveFolders::orderThatDoesNotFitCostsNoTitle()
+{
+    const QString folder = abc(QStringLiteral("full"));
+    const auto assertAllThere = [&folder] {
+        for (const char* name : {"/a.xml", "/b.xml", "/c.xml", "/a_240.png", "/b_240.png", "/c_240.png"})
+            QVERIFY2(QFile::exists(folder + name), name);
+    };
+    m->open(folder);
+    m->list->moveButtonClicked(true);
+    {
+        const FullDisk disk;
+        m->carry(0, 65 + TitleListFixture::ROW);
+        QVERIFY(!QFile::exists(folder + "/.order.xml"));
+        m->list->synchronizationFolderFile();
+        assertAllThere();
+    }
+    // There is room again when the folder is closed.
+    m->list->synchronizationFolderFile();
+    assertAllThere();
+    QCOMPARE(LibraryFixture::order(folder), m->stems());
+    QCOMPARE(m->stems(), (Names{"b", "a", "c"}));
+
+    // It was opened without an order.
+    QVERIFY(QFile::remove(folder + "/.order.xml"));
+    m->list->refreshArchiveList(folder);
+    QVERIFY(m->list->isEmpty());
+    m->list->synchronizationFolderFile();
+    assertAllThere();
 }
 
 void tst_ArchiveFolders::skippedTitlesLeaveTheOrderAtTheNextChange()

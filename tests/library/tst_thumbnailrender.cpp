@@ -3,8 +3,10 @@
 
 #include "library/ThumbnailRender.h"
 
+#include <QElapsedTimer>
 #include <QSignalSpy>
 #include <QTest>
+#include <QThread>
 
 namespace
 {
@@ -37,6 +39,8 @@ private slots:
     void hugeBackgroundGivesPicturesOfTheUsualSize();
     void slowStageWritesFourFiles();
     void slowStageRemovesTheOldBigPicture();
+    void slowStageDrawsWhileTheEventsGoOn();
+    void waitingWithoutEventsDrawsWhatIsLeft();
     void textsStandAtOneAndAHalfTimesTheirPlace();
     void textOutsideTheRasterIsHarmless();
     void middlePictureIsTheBigOneReduced();
@@ -187,6 +191,42 @@ void tst_ThumbnailRender::slowStageRemovesTheOldBigPicture()
     const auto archive = LibraryFixture::makeRecord(folder, QStringLiteral("t"), QString());
     paint(folder + QStringLiteral("/t_1920.png"), QSize(10, 10), Qt::red);
     QCOMPARE(slowPicture(*archive, "_1920.png").size(), QSize(1920, 1080));
+}
+
+// Nobody asks whether it has finished.
+void tst_ThumbnailRender::slowStageDrawsWhileTheEventsGoOn()
+{
+    const QString folder = mFixture.makeFolder(QStringLiteral("events"));
+    paint(folder + QStringLiteral("/bg.png"), QSize(1920, 1080), QColor(20, 90, 40));
+    TitleReportRecorder reports;
+    ThumbnailRender render;
+    Reports wanted;
+    for (const QString name : {"a", "b", "c"}) {
+        const auto archive = LibraryFixture::makeRecord(folder, name, QStringLiteral("In order"));
+        archive->setBgResourceBig(name == QLatin1String("c") ? "" : "bg.png");
+        render.makeThumbnail(archive.get(), true); // the record goes before the picture is drawn
+        wanted.append({1, name});
+    }
+    Reports seen;
+    QTRY_COMPARE_WITH_TIMEOUT((seen += reports.take()).size(), wanted.size(), 20000);
+    QCOMPARE(seen, wanted);
+    QCOMPARE(QImage(folder + QStringLiteral("/b_1920.png")).pixelColor(5, 5), QColor(20, 90, 40));
+    QCOMPARE(QImage(folder + QStringLiteral("/c_1920.png")).pixelColor(5, 5).alpha(), 0);
+}
+
+void tst_ThumbnailRender::waitingWithoutEventsDrawsWhatIsLeft()
+{
+    const QString folder = mFixture.makeFolder(QStringLiteral("blocked"));
+    paint(folder + QStringLiteral("/bg.png"), QSize(1920, 1080), QColor(20, 90, 40));
+    const auto archive = LibraryFixture::makeRecord(folder, QStringLiteral("t"), QStringLiteral("Blocked"));
+    archive->setBgResourceBig("bg.png");
+    ThumbnailRender render;
+    render.makeThumbnail(archive.get(), true);
+    QElapsedTimer time;
+    time.start();
+    while (!render.makePictureThreadIsFinished() && time.elapsed() < 20000)
+        QThread::msleep(1); // as the window does when it closes: no events come in
+    QCOMPARE(QImage(folder + QStringLiteral("/t_1920.png")).pixelColor(5, 5), QColor(20, 90, 40));
 }
 
 void tst_ThumbnailRender::textsStandAtOneAndAHalfTimesTheirPlace()

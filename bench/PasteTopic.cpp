@@ -1,0 +1,162 @@
+// Pasting a title with a photograph behind its texts, while the title that is left has no pictures yet.
+#include "bench/BenchEnvironment.h"
+#include "bench/BenchTitles.h"
+#include "bench/PairList.h"
+#include "bench/TitleEditor.h"
+#include "bench/Topics.h"
+#include "document/ArchiveController.h"
+#include "document/ITitleChangeReporter.h"
+#include "library/ArchiveAction.h"
+#include "library/ArchiveItem.h"
+#include "library/ThumbnailRender.h"
+
+#include <QCoreApplication>
+#include <QDir>
+#include <QElapsedTimer>
+#include <QFile>
+#include <QFileInfo>
+#include <QPainter>
+#include <algorithm>
+#include <atomic>
+
+namespace
+{
+
+constexpr double PASTE_AIM = 3.0;
+constexpr double LONGEST_STEP = 50; // milliseconds
+constexpr double NANOSECONDS = 1e9;
+constexpr int CHARACTERS = 40;
+constexpr int CHARACTER_SIZE = 48;
+const QSize AIR(1920, 1080);
+
+// Gives the title at path all its pictures and the photograph as a background of its own.
+void illustrate(const QString& folder, const std::string& path, const QImage& photograph)
+{
+    const QString stem =
+        folder + QLatin1Char('/') + QFileInfo(QString::fromStdString(path)).completeBaseName();
+    const auto savePicture = [&stem, &photograph](const QString& end, QSize size) {
+        photograph.copy(QRect(QPoint(), size)).save(stem + end);
+        return QFileInfo(stem + end).fileName().toStdString();
+    };
+    Archive title = BenchTitles::title(path, CHARACTERS, CHARACTER_SIZE);
+    title.setBgResource(savePicture(QStringLiteral("_source_1280.png"), TitleEditor::CANVAS));
+    title.setBgResourceBig(savePicture(QStringLiteral("_source_1920.png"), AIR));
+    savePicture(QStringLiteral("_1920.png"), AIR);
+    savePicture(QStringLiteral("_960.png"), AIR / 2);
+    savePicture(QStringLiteral("_240.png"), AIR / 8);
+    savePicture(QStringLiteral("_240S.png"), AIR / 8);
+    ArchiveController().saveNewArchive(folder, &title);
+}
+
+// A folder of two titles with different photographs.
+QString photographFolder(const BenchEnvironment& environment)
+{
+    static const QString folder = [&environment] {
+        const QString path = environment.makeFolder(QStringLiteral("paste"));
+        QImage photograph = BenchTitles::photograph(AIR);
+        for (const std::string& title : BenchTitles::writeFolder(path.toStdString(), 2)) {
+            illustrate(path, title, photograph);
+            photograph.mirror();
+        }
+        return path;
+    }();
+    return folder;
+}
+
+// Counts the titles whose pictures have been written.
+class PictureCount : public ITitleChangeReporter
+{
+public:
+    PictureCount() { ITitleChangeReporter::setInstance(this); }
+    ~PictureCount() override { ITitleChangeReporter::setInstance(nullptr); }
+    int count() const { return mCount; }
+
+    void changeTitlerStatus(FileManagerDefine::emTITLECHANGE_TYPE change, QString) override
+    {
+        if (change == FileManagerDefine::TITLE_PICTURES_CHANGED)
+            ++mCount;
+    }
+
+private:
+    std::atomic<int> mCount = 0;
+};
+
+// Lets the event loop run until all is painted that comes of the call and the pictures of a title have been
+// written. Returns the longest pass in seconds.
+template <typename Call>
+double longestPass(TitleEditor& editor, const PictureCount& pictures, Call call)
+{
+    const int before = pictures.count();
+    QMetaObject::invokeMethod(&editor.scene, call, Qt::QueuedConnection);
+    double longest = 0;
+    const auto measure = [&longest](auto pass) {
+        QElapsedTimer time;
+        time.start();
+        pass();
+        longest = std::max(longest, static_cast<double>(time.nsecsElapsed()) / NANOSECONDS);
+    };
+    bool isWritten = false;
+    do {
+        isWritten = pictures.count() > before;
+        measure([] { QCoreApplication::processEvents(); });
+        for (QWidget* window :
+             {static_cast<QWidget*>(&editor.shown.list), static_cast<QWidget*>(&editor.view)})
+            measure([window] { QCoreApplication::sendPostedEvents(window, QEvent::UpdateRequest); });
+    } while (!isWritten);
+    return longest;
+}
+
+void pasteTitle(benchmark::State& state, const BenchEnvironment& environment)
+{
+    const PictureCount pictures;
+    TitleEditor editor(photographFolder(environment), std::make_unique<ThumbnailRender>());
+    ArchiveList& list = editor.shown.list;
+    ArchiveAction copy(QString(), ArchiveAction::ACTION_COPY, nullptr);
+    ArchiveAction paste(QString(), ArchiveAction::ACTION_PASTE, nullptr);
+    list.selectOperationArchive(1); // the canvas shows the other one
+    list.selectOptionMenuItem(&copy);
+    for ([[maybe_unused]] auto _ : state) {
+        editor.scene.saveArchiveFlag(); // the title that is left was changed
+        state.SetIterationTime(longestPass(editor, pictures, [&] { list.selectOptionMenuItem(&paste); }));
+        if (list.count() != 3)
+            state.SkipWithError("the title was not pasted");
+        longestPass(editor, pictures, [&editor] { editor.undo.undo(); });
+        list.synchronizationFolderFile();
+    }
+}
+
+// The files of the title copied, and its scene drawn once.
+void copyAndDraw(benchmark::State& state, const BenchEnvironment& environment)
+{
+    const QString folder = photographFolder(environment);
+    TitleEditor editor(folder, nullptr);
+    const QFileInfo title(editor.shown.list.archiveItem(0)->getArchiveDataPath());
+    const QFileInfoList files =
+        QDir(folder).entryInfoList({title.completeBaseName() + QLatin1Char('*')}, QDir::Files);
+    const QString target = environment.makeFolder(QStringLiteral("copies")) + QLatin1Char('/');
+    QImage picture(TitleEditor::CANVAS, QImage::Format_ARGB32_Premultiplied);
+    for ([[maybe_unused]] auto _ : state) {
+        QElapsedTimer time;
+        time.start();
+        for (const QFileInfo& file : files)
+            QFile::copy(file.filePath(), target + file.fileName());
+        picture.fill(Qt::transparent);
+        QPainter painter(&picture);
+        painter.setRenderHint(QPainter::Antialiasing);
+        editor.scene.render(&painter);
+        state.SetIterationTime(static_cast<double>(time.nsecsElapsed()) / NANOSECONDS);
+        for (const QFileInfo& file : files)
+            QFile::remove(target + file.fileName());
+    }
+}
+
+} // namespace
+
+void Topics::addPaste(PairList& list, const BenchEnvironment& environment)
+{
+    const BenchEnvironment* place = &environment;
+    list.add(
+        {"paste_step", PASTE_AIM, PairList::Clock::Step, LONGEST_STEP}, benchmark::kMillisecond,
+        [place](benchmark::State& state) { pasteTitle(state, *place); },
+        [place](benchmark::State& state) { copyAndDraw(state, *place); });
+}

@@ -1,0 +1,40 @@
+// The picture in a background file. Whoever shows the same file at the same time, or another one with the
+// same bytes, as a pasted title does, shares the decoded pixels; nothing is kept for later.
+#pragma once
+
+#include <QImage>
+#include <QPixmap>
+#include <QString>
+#include <memory>
+#include <sys/stat.h>
+
+class BackgroundPicture
+{
+public:
+    // Never null; a file that cannot be read gives an empty pixmap. GUI thread only.
+    static std::shared_ptr<const BackgroundPicture> load(const QString& path);
+    // The same in two steps, of which any thread may do the first one, which takes long.
+    struct Decoded {
+        QString path;
+        struct stat status = {};
+        QImage image;
+    };
+    static Decoded decode(const QString& path);
+    static std::shared_ptr<const BackgroundPicture> load(const Decoded& decoded);
+    // Null when nobody has a picture of the file or one with the same bytes. GUI thread only.
+    static std::shared_ptr<const BackgroundPicture> find(const QString& path);
+    // Decodes into the format that needs no conversion for a pixmap; null when that cannot be done. Any
+    // thread.
+    static QImage read(const QString& path);
+
+    const QPixmap& pixmap() const { return m_pixmap; }
+
+private:
+    explicit BackgroundPicture(const Decoded& decoded);
+    // Whether the picture is what the file with this status holds.
+    bool isThatOf(const QString& path, const struct stat& status) const;
+
+    QString m_path;
+    struct stat m_status;
+    QPixmap m_pixmap;
+};
