@@ -45,7 +45,10 @@ int writeTitles(const char* folder, const char* count)
 {
     constexpr int TEXTS = 3; // leaves room for one more
     const int wanted = std::atoi(count);
-    return BenchTitles::writeIllustratedFolder(folder, wanted, TEXTS).size() == static_cast<std::size_t>(wanted) ? 0 : 1;
+    return BenchTitles::writeIllustratedFolder(folder, wanted, TEXTS).size() ==
+                   static_cast<std::size_t>(wanted)
+               ? 0
+               : 1;
 }
 
 bool takeOption(std::vector<char*>& arguments, const char* option)

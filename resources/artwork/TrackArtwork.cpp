@@ -74,9 +74,9 @@ void addScrollBars(QList<Picture>& table)
                               trackAcross));
     // Behind the handle of a list that is shown whole, and on the handle of one that scrolls.
     table.append(sizedPicture(WIDGET_COLLECTION, QStringLiteral("back"), QSize(20, STRETCH), track));
-    table.append(sizedPicture(
-        WIDGET_COLLECTION, QStringLiteral("control"), QSize(14, GRIP),
-        [](QPainter& painter, const QSize& size) { handle(painter, size, true, false); }));
+    table.append(
+        sizedPicture(WIDGET_COLLECTION, QStringLiteral("control"), QSize(14, GRIP),
+                     [](QPainter& painter, const QSize& size) { handle(painter, size, true, false); }));
     for (const bool pressed : {false, true}) {
         const QString state = pressed ? QStringLiteral("pressed_") : QStringLiteral("rest_");
         const QString down = folder + QStringLiteral("Scbar_handle_v_") + state;
