@@ -154,11 +154,11 @@ void ArchiveList::addRecords(const QList<Archive*>& archives)
     QStringList pictures;
     for (const Archive* archive : mArchives)
         pictures.append(archive->getFullPathOfThumbnailSmall());
-    mSmallPictures = std::make_unique<SmallPictures>(pictures, ArchiveItem::PICTURE_SIZE);
     QList<KSBaseItemWidget*> items;
     for (Archive* archive : mArchives)
         items.append(createBaseItem(archive));
     addWidgetItems(&items, -1);
+    mSmallPictures = std::make_unique<SmallPictures>(pictures, ArchiveItem::PICTURE_SIZE);
 }
 
 ArchiveItem* ArchiveList::createBaseItem(Archive* archive)

@@ -4,6 +4,7 @@
 
 #include "canvas/CanvasScene.h"
 #include "canvas/GraphicsText.h"
+#include "library/ArchiveAction.h"
 #include "library/ArchiveItem.h"
 #include "library/ArchiveList.h"
 #include "library/ThumbnailRender.h"
@@ -25,6 +26,7 @@ private slots:
     void newTitleShowsItsPictureAtOnce();
     void leavingANewTitleWritesItsPictures();
     void leavingATextThatIsTypedWritesItsPictures();
+    void pastedTitleHasTheBackgroundOfItsFile();
     void deletedTitleLeavesTheCanvas();
     void deletedTitleLeavesNoPictures();
     void picturesShowWhatTheCanvasShows();
@@ -147,6 +149,46 @@ void tst_ListAndCanvas::leavingATextThatIsTypedWritesItsPictures()
     mList->selectArchive(0);
     QVERIFY(mScene->isEditFinish());
     QVERIFY(!QFile::exists(folder + QStringLiteral("/b_1920.png")));
+}
+
+// It is decoded while the copy is held, so a file that changes in between must be noticed.
+void tst_ListAndCanvas::pastedTitleHasTheBackgroundOfItsFile()
+{
+    const QString folder = mFixture.makeFolder(QStringLiteral("paste"));
+    LibraryFixture::fillFolder(folder, {QStringLiteral("a"), QStringLiteral("b")});
+    const auto archive = LibraryFixture::makeRecord(folder, QStringLiteral("a"), QStringLiteral("A"));
+    archive->setBgResource("a_source_1280.png");
+    archive->setBgResourceBig("a_source_1920.png");
+    QVERIFY(ArchiveController().saveNewArchive(folder, archive.get()));
+    const auto paint = [&folder](const QColor& colour) {
+        QImage image(1280, 720, QImage::Format_RGB32);
+        image.fill(colour);
+        return image.save(folder + QStringLiteral("/a_source_1280.png")) &&
+               image.save(folder + QStringLiteral("/a_source_1920.png"));
+    };
+    const auto colourOnCanvas = [this] {
+        QImage canvas(1280, 720, QImage::Format_RGB32);
+        QPainter painter(&canvas);
+        mScene->render(&painter, QRectF(), QRectF(0, 0, 1280, 720));
+        painter.end();
+        return canvas.pixelColor(1270, 710);
+    };
+    ArchiveAction copy(QString(), ArchiveAction::ACTION_COPY, nullptr);
+    ArchiveAction pasteIt(QString(), ArchiveAction::ACTION_PASTE, nullptr);
+    QVERIFY(paint(Qt::darkRed));
+    mList->refreshArchiveListInFile(folder, QStringLiteral("b.xml"));
+
+    mList->selectOperationArchive(0);
+    mList->selectOptionMenuItem(&copy);
+    mList->selectOptionMenuItem(&pasteIt);
+    QCOMPARE(mList->count(), 3);
+    QVERIFY(canvasTitle() != QStringLiteral("a") && canvasTitle() != QStringLiteral("b"));
+    QCOMPARE(colourOnCanvas(), QColor(Qt::darkRed));
+
+    QVERIFY(paint(Qt::darkBlue));
+    mList->selectOptionMenuItem(&pasteIt);
+    QCOMPARE(mList->count(), 4);
+    QCOMPARE(colourOnCanvas(), QColor(Qt::darkBlue));
 }
 
 void tst_ListAndCanvas::deletedTitleLeavesTheCanvas()
