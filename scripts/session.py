@@ -8,6 +8,7 @@ import ctypes
 import json
 import os
 import re
+import shlex
 import signal
 import struct
 import subprocess
@@ -126,8 +127,7 @@ class Display:
                 raise SessionError(f"no display, see {self.server.log}")
             self.name = f":{number}"
             self.environment = dict(environment, DISPLAY=self.name)
-            self.manager = Process(["openbox", "--sm-disable"], os.path.join(folder, "openbox.log"), self.environment)
-            wait_until(self._is_managed, 20, "openbox")
+            self._start_manager(os.path.join(folder, "openbox-started"))
         except BaseException:
             self.stop()
             raise
@@ -137,11 +137,19 @@ class Display:
         return ["Xvfb", "-displayfd", str(number_pipe), "-screen", "0", f"{WIDTH}x{HEIGHT}x24", "-nolisten", "tcp",
                 "-noreset", "-fbdir", self.folder]
 
-    def _is_managed(self):
-        self.manager.check()
-        done = subprocess.run(["xdotool", "get_desktop"], env=self.environment, stdout=subprocess.DEVNULL,
-                              stderr=subprocess.DEVNULL, check=False)
-        return done.returncode == 0
+    def _start_manager(self, mark):
+        """Starts openbox, which makes the file mark as soon as it has started. Before that it may miss a window that
+        is shown, although it already says on the root window that it is there."""
+        if os.path.exists(mark):
+            os.remove(mark)
+        self.manager = Process(["openbox", "--sm-disable", "--startup", shlex.join(["touch", mark])],
+                               os.path.join(self.folder, "openbox.log"), self.environment)
+
+        def has_started():
+            self.manager.check()
+            return os.path.exists(mark)
+
+        wait_until(has_started, 20, "openbox")
 
     def stop(self):
         if self.manager:

@@ -5,10 +5,14 @@
 #include "touchui/KSInputFocusManager.h"
 
 #include <QApplication>
+#include <QDeadlineTimer>
+#include <QFile>
 #include <QLineEdit>
 #include <QProcess>
 #include <QPushButton>
+#include <QTemporaryDir>
 #include <QTest>
+#include <QThread>
 #include <QVBoxLayout>
 
 #define XK_MISCELLANY
@@ -30,28 +34,6 @@ using namespace SubCommonDefine;
 
 namespace
 {
-
-// A window that is shown before the window manager is up gets the focus late or loses it again.
-bool windowManagerIsUp()
-{
-    Display* display = XOpenDisplay(nullptr);
-    if (display == nullptr) {
-        return false;
-    }
-    Atom type = 0;
-    int format = 0;
-    unsigned long count = 0;
-    unsigned long rest = 0;
-    unsigned char* data = nullptr;
-    XGetWindowProperty(display, DefaultRootWindow(display),
-                       XInternAtom(display, "_NET_SUPPORTING_WM_CHECK", 0), 0, 1, 0, AnyPropertyType, &type,
-                       &format, &count, &rest, &data);
-    if (data != nullptr) {
-        XFree(data);
-    }
-    XCloseDisplay(display);
-    return count == 1;
-}
 
 // Gives letters that the keyboard lacks a key of their own. A tool that maps each of them for the moment of
 // its key press may have taken it away again before the program has read the map.
@@ -122,7 +104,6 @@ private Q_SLOTS:
 private:
     void press(const QStringList& arguments);
 
-    QProcess m_windowManager;
     KSAppEventFilter m_filter;
     FakeService m_service;
     std::unique_ptr<QWidget> m_window;
@@ -133,9 +114,6 @@ private:
 void TestInputContextX11::initTestCase()
 {
     QCOMPARE(QGuiApplication::platformName(), QStringLiteral("xcb"));
-    m_windowManager.start(QStringLiteral("openbox"), {QStringLiteral("--sm-disable")});
-    QVERIFY(m_windowManager.waitForStarted());
-    QTRY_VERIFY(windowManagerIsUp());
     constexpr KeySym UNICODE = 0x1000000;
     QList<KeySym> symbols{XK_dead_acute};
     for (const QChar letter : QStringLiteral("速報속보")) {
@@ -153,8 +131,7 @@ void TestInputContextX11::initTestCase()
     layout->addWidget(button);
     layout->addWidget(m_edit);
     m_window->resize(300, 200);
-    m_window->show();
-    m_window->activateWindow();
+    m_window->show(); // the window manager gives a new window the focus
     QVERIFY(QTest::qWaitForWindowActive(m_window.get()));
     m_edit->setFocus();
 }
@@ -164,8 +141,6 @@ void TestInputContextX11::cleanupTestCase()
     m_second.reset();
     m_window.reset();
     KSInputContext::instance()->setKeyBoardController(nullptr);
-    m_windowManager.terminate();
-    QVERIFY(m_windowManager.waitForFinished());
 }
 
 void TestInputContextX11::press(const QStringList& arguments)
@@ -221,8 +196,9 @@ void TestInputContextX11::requestWithoutAFieldGivesBackTheFocus()
 {
     m_second = std::make_unique<QWidget>();
     m_second->resize(100, 100);
+    // Shown, not activated as well: the window manager would give it the focus twice, the second time perhaps
+    // after the request below has given it back.
     m_second->show();
-    m_second->activateWindow();
     QVERIFY(QTest::qWaitForWindowActive(m_second.get()));
     KSInputContext* context = KSInputContext::instance();
     context->setWindowID(m_window->winId());
@@ -244,11 +220,24 @@ void TestInputContextX11::deadWindowDoesNoHarm()
 
 int main(int argc, char** argv)
 {
+    // Qt asks what the window manager can do once, when it connects, and a window that is mapped while the
+    // manager starts may never be taken over: the manager says that it has started by making a file.
+    const QTemporaryDir folder;
+    const QString started = folder.filePath(QStringLiteral("started"));
+    QProcess windowManager;
+    windowManager.start(QStringLiteral("openbox"),
+                        {QStringLiteral("--sm-disable"), QStringLiteral("--startup"),
+                         QStringLiteral("touch \"%1\"").arg(started)});
+    for (const QDeadlineTimer limit(20000); !QFile::exists(started) && !limit.hasExpired();) {
+        QThread::msleep(10);
+    }
     KSInputContext::install();
     QApplication app(argc, argv);
     TestInputContextX11 test;
     QTEST_SET_MAIN_SOURCE_PATH
-    return QTest::qExec(&test, argc, argv);
+    const int result = QTest::qExec(&test, argc, argv);
+    windowManager.terminate();
+    return windowManager.waitForFinished() ? result : EXIT_FAILURE;
 }
 
 #include "tst_inputcontextx11.moc"
