@@ -39,8 +39,8 @@ void ShowTitlerController::setFactory(TitlerToolFactory* factory)
 
 void ShowTitlerController::changeFolderStatus(SubCommonDefine::tagFOLDER_TYPE folder)
 {
-    qDebug() << "ShowTitlerController_changeFolderStatus() [setFolderStatus()] Path:" +
-                    QString::fromStdWString(folder.path);
+    qDebug().noquote() << "ShowTitlerController_changeFolderStatus() [setFolderStatus()] Path:" +
+                              QString::fromStdWString(folder.path);
     if (mProxy)
         mProxy->setFolderStatus(std::move(folder));
 }

@@ -73,6 +73,7 @@ public:
 
     // Puts what is being edited on its way to disk, as leaving the title does.
     void saveCurrentTitle();
+    void waitUntilSaved();
 
     bool archiveListIsMoveMode() const;
 

@@ -12,6 +12,7 @@
 #include "library/FolderPicker.h"
 #include "library/TemplatePicker.h"
 #include "panel/TextToolsPanel.h"
+#include "support/LogManager.h"
 #include "touchui/KSInputContext.h"
 
 #include <QAction>
@@ -92,7 +93,8 @@ void TitlerWindow::refreshArchiveList(QString path)
 void TitlerWindow::closeTitlerWindow()
 {
     mArchiveList->stopArchiveListTapAndHoldTimer();
-    slotCancelArchiveListMoveMode(); // what is being dragged gets its place while the folder is open
+    if (archiveListIsMoveMode())
+        slotCancelArchiveListMoveMode(); // what is being dragged gets its place while the folder is open
     mArchiveList->slotHideOptionMenu();
     const QString path = mArchiveList->getCurrentPath();
     saveCurrentTitle();
@@ -104,8 +106,7 @@ void TitlerWindow::closeTitlerWindow()
         mEditTitlerController->editFolderEndStatus(path);
     mToolsBar->resetToDefaultState();
     resetCanvasBackground();
-    while (!dataSaveIsFinished())
-        ::sleep(SAVE_POLL_SECONDS);
+    waitUntilSaved();
 
     if (m_bEditByMain && EditContextController::getInstance()->isMainNeedMsg()) {
         if (mShowMessageController)
@@ -161,6 +162,16 @@ bool TitlerWindow::dataSaveIsFinished()
     return mCanvasScene->isEditFinish();
 }
 
+void TitlerWindow::waitUntilSaved()
+{
+    while (!dataSaveIsFinished())
+        ::sleep(SAVE_POLL_SECONDS);
+    // The thread that writes the pictures reports them by way of this thread's events. Siblings hear of them
+    // before they hear of what follows, and before the process is gone.
+    if (mEditTitlerController)
+        QCoreApplication::sendPostedEvents(mEditTitlerController, QEvent::MetaCall);
+}
+
 void TitlerWindow::saveCurrentTitle()
 {
     mGraphicsView->endTouch(); // an object that is being dragged stays where it is
@@ -180,8 +191,7 @@ void TitlerWindow::endProcess()
     m_bEnding = true;
     mFolderPicker->done(QDialog::Rejected); // a dialog with no Cancel would refuse the end
     saveCurrentTitle();
-    while (!dataSaveIsFinished())
-        ::sleep(SAVE_POLL_SECONDS);
+    waitUntilSaved();
     close();
     QApplication::closeAllWindows();
     QCoreApplication::quit();
@@ -272,7 +282,7 @@ void TitlerWindow::leaveTextEditing(bool deleteEmptyItems)
             slotDeleteEmptyItems();
         mCanvasScene->disableTextPropertyArea();
         if (isEditing && deleteEmptyItems)
-            qDebug("hideSoftWareWithDeleteEmptyItems");
+            LOG_DEBUG_OPERATE(L"TitlerWindow", 200, L"hideSoftWareWithDeleteEmptyItems");
     }
     if (mInputContext)
         mInputContext->dummyCloseSoftKeyBoardWindow();

@@ -9,6 +9,7 @@
 #include "library/FolderPicker.h"
 #include "library/TemplatePicker.h"
 #include "panel/TextToolsPanel.h"
+#include "support/LogManager.h"
 #include "support/SystemInfo.h"
 #include "touchui/KSPushbutton.h"
 
@@ -42,14 +43,17 @@ bool isGraphicsView(const QWidget* widget)
 
 void TitlerWindow::slotDeleteEmptyItems()
 {
-    if (!isGraphicsView(QApplication::widgetAt(QCursor::pos())))
+    // Over the canvas lies the viewport of its view: a tap beside a text that was left empty takes that away.
+    if (!qobject_cast<QGraphicsView*>(QApplication::widgetAt(QCursor::pos())))
         mCanvasScene->slotDeleteEmptyItems();
 }
 
 void TitlerWindow::mousePressEvent(QMouseEvent* event)
 {
     QWidget* child = childAt(mapFromGlobal(QCursor::pos()));
-    qDebug() << "#POS#:" << child << QCursor::pos() << event->position() << event->globalPosition();
+    QString places;
+    QDebug(&places) << "#POS#:" << child << QCursor::pos() << event->position() << event->globalPosition();
+    LOG_DEBUG_OPERATE(L"TitlerWindow", 200, places.toStdWString());
     if (TEXT_PROPERTY_RECT.contains(mapFromGlobal(event->globalPosition().toPoint()))) {
         QMainWindow::mousePressEvent(event);
         QMainWindow::mousePressEvent(event);
@@ -123,6 +127,8 @@ bool TitlerWindow::ignoreMouseAndTouchEventWhenArchiveListIsMoveMode(QObject* ob
     if (list.contains(global) || button.contains(global))
         return false;
     slotCancelArchiveListMoveMode();
+    if (event->type() == QEvent::TouchBegin)
+        slotCancelArchiveListMoveMode(); // siblings hear of a finger twice
     return true;
 }
 
@@ -158,10 +164,7 @@ void TitlerWindow::slotChangeDoneToMoveMode()
 
 void TitlerWindow::slotCancelArchiveListMoveMode()
 {
-    if (!archiveListIsMoveMode())
-        return;
-    if (WINDOW_IS_SHOWN)
-        sendTransientControlEvent(false);
+    reportHiddenControl();
     changeMoveMode(false);
 }
 
@@ -328,7 +331,9 @@ void TitlerWindow::switchTranslator(SystemSetupDef::emSystemLanguageType type)
     }
     const QString file =
         type == SystemSetupDef::emSystemLanguageChinese ? QStringLiteral("cn.qm") : QStringLiteral("en.qm");
-    if (!mTranslator->load(m_strTranslationPath + file))
+    // Loading empties the translator first, also when it fails: the language of before has to stay.
+    if (QTranslator probe;
+        !probe.load(m_strTranslationPath + file) || !mTranslator->load(m_strTranslationPath + file))
         return;
     QCoreApplication::installTranslator(mTranslator);
     retranslateUI();

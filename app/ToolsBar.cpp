@@ -275,6 +275,9 @@ void ToolsBar::setToolEnabled(const ToolButton& tool, bool enabled)
 // A button that disables itself under the finger never sees the end of the touch, which it still holds.
 void ToolsBar::setPushButtonDisabled(QPushButton* button)
 {
+    if (!button->isEnabled()) {
+        return; // it holds nothing, and what others hold is theirs
+    }
     button->setEnabled(false);
     if (APPEventFilter* filter = APPEventFilter::instance()) {
         filter->unlock();

@@ -1,9 +1,9 @@
 #include "app/APPEventFilter.h"
 #include "app/TitlerWindow.h"
 #include "support/FileSyncQueue.h"
+#include "support/FolderLookup.h"
 #include "support/IPathManagerEx.h"
 #include "support/LeftoverSweep.h"
-#include "support/LocaleText.h"
 #include "support/SystemSignalHandler.h"
 #include "touchui/KSInputContext.h"
 
@@ -43,10 +43,11 @@ void keepMemoryFlat()
 // What a process that was killed in the middle of a save left behind; the list looks after the title folders.
 void sweepSettings()
 {
-    IPathManagerEx* paths = IPathManagerEx::getInstance();
-    for (const std::wstring& folder : {paths->getSystemSettingPath(), paths->getTitlerTemplatesPath()}) {
+    for (const FolderLookup::Getter getter :
+         {&IPathManagerEx::getSystemSettingPath, &IPathManagerEx::getTitlerTemplatesPath}) {
+        const std::string folder = FolderLookup::multiByte(getter);
         if (!folder.empty())
-            LeftoverSweep::sweepWithChildren(wideToMultiByte(folder));
+            LeftoverSweep::sweepWithChildren(folder);
     }
 }
 

@@ -1,6 +1,7 @@
 #include "canvas/BackgroundPicture.h"
 
 #include <QFile>
+#include <QFileInfo>
 #include <QImageReader>
 #include <cstring>
 #include <vector>
@@ -105,9 +106,7 @@ bool BackgroundPicture::isThatOf(const QString& path, const struct stat& status)
 // canvas, and four megabytes large.
 QImage BackgroundPicture::read(const QString& path)
 {
-    struct stat status = {};
-    const bool exists = ::stat(QFile::encodeName(path).constData(), &status) == 0;
-    if (path.isEmpty() || (exists && !S_ISREG(status.st_mode)))
+    if (!QFileInfo(path).isFile()) // a pipe would be waited for
         return {};
     QImage image = QImageReader(path).read();
     if (!image.isNull())

@@ -5,6 +5,7 @@
 #include "document/LastSettingParser.h"
 #include "document/TitleParser.h"
 #include "document/TitleParserUtility.h"
+#include "support/FolderLookup.h"
 #include "support/IPathManagerEx.h"
 
 #include <QFileInfo>
@@ -66,8 +67,7 @@ void ArchiveManager::cleanUp()
 std::string ArchiveManager::getTitleRootFolderPath()
 {
     const std::lock_guard lock(gRootMutex);
-    mTitleRootFolderPath =
-        TitleParserUtility::wstring2String(IPathManagerEx::getInstance()->getTitleResourcesPath());
+    mTitleRootFolderPath = FolderLookup::multiByte(&IPathManagerEx::getTitleResourcesPath);
     return mTitleRootFolderPath;
 }
 

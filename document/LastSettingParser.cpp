@@ -2,6 +2,7 @@
 
 #include "document/DocumentConstants.h"
 #include "document/TitleParserUtility.h"
+#include "support/FolderLookup.h"
 #include "support/IPathManagerEx.h"
 #include "support/XmlFile.h"
 
@@ -10,7 +11,7 @@
 LastSettingParser::LastSettingParser(std::string folder)
 {
     if (folder.empty())
-        folder = TitleParserUtility::wstring2String(IPathManagerEx::getInstance()->getSystemSettingPath());
+        folder = FolderLookup::multiByte(&IPathManagerEx::getSystemSettingPath);
     if (!folder.empty())
         mFilePath = folder + TEMP_FILENAME;
 }

@@ -3,6 +3,7 @@
 #include "document/DocumentConstants.h"
 #include "document/FontStyle.h"
 #include "document/TitleParserUtility.h"
+#include "support/FolderLookup.h"
 #include "support/IPathManagerEx.h"
 #include "support/XmlFile.h"
 
@@ -10,8 +11,7 @@
 
 SettingManager::SettingManager()
 {
-    const std::string folder =
-        TitleParserUtility::wstring2String(IPathManagerEx::getInstance()->getSystemSettingPath());
+    const std::string folder = FolderLookup::multiByte(&IPathManagerEx::getSystemSettingPath);
     if (!folder.empty())
         mFilePath = folder + SETTING_FILENAME;
 }
@@ -51,7 +51,7 @@ int SettingManager::resetTextParameter()
 
 std::wstring SettingManager::getImportFontsPath()
 {
-    return IPathManagerEx::getInstance()->getFontsPath();
+    return FolderLookup::wide(&IPathManagerEx::getFontsPath);
 }
 
 std::string SettingManager::getAttribute(TiXmlElement* element, std::string key)

@@ -4,6 +4,7 @@
 #include "document/DocumentConstants.h"
 #include "document/LastSettingParser.h"
 #include "document/TitleParserUtility.h"
+#include "support/FolderLookup.h"
 #include "support/IPathManagerEx.h"
 
 #include <boost/filesystem.hpp>
@@ -17,11 +18,7 @@ namespace
 // Empty when the folder is not told or cannot be made.
 std::string templatesRoot()
 {
-    try {
-        return TitleParserUtility::wstring2String(IPathManagerEx::getInstance()->getTemplatesPath());
-    } catch (const boost::filesystem::filesystem_error&) {
-        return {};
-    }
+    return FolderLookup::multiByte(&IPathManagerEx::getTemplatesPath);
 }
 
 } // namespace

@@ -156,6 +156,10 @@ void ArchiveItem::createRightChild()
 
 void ArchiveItem::updateContents(QImage image)
 {
+    if (!hasChildWidgets()) {
+        initArchiveItemChildWidget(image); // now, or its turn would show the picture of before
+        return;
+    }
     updateLeftChild(image);
     updateRightChild();
 }

@@ -2,7 +2,6 @@
 
 #include "document/Archive.h"
 #include "document/ArchiveController.h"
-#include "document/ArchiveManager.h"
 #include "document/ArchiveOrder.h"
 #include "document/TitleParser.h"
 #include "library/ArchiveInitThread.h"
@@ -11,8 +10,11 @@
 #include "library/FocusArchiveCommand.h"
 #include "library/ITitlerFolderReporter.h"
 #include "library/SmallPictures.h"
+#include "support/FolderLookup.h"
+#include "support/IPathManagerEx.h"
 #include "support/LeftoverSweep.h"
 #include "support/LogManager.h"
+#include "support/XmlFile.h"
 
 #include <QCoreApplication>
 #include <QDir>
@@ -21,6 +23,7 @@
 #include <QFileInfo>
 #include <QLabel>
 #include <string>
+#include <tinyxml.h>
 
 namespace
 {
@@ -33,7 +36,7 @@ const int LABEL_FONT_SIZE = 13; // points
 // What a killed process left half-written in the title folders goes before anything is read from them.
 void sweepTitleFolders()
 {
-    const std::string root = ArchiveManager::getInstance()->getTitleRootFolderPath();
+    const std::string root = FolderLookup::multiByte(&IPathManagerEx::getTitleResourcesPath);
     if (!root.empty())
         LeftoverSweep::sweepWithChildren(root);
 }
@@ -432,11 +435,14 @@ void ArchiveList::synchronizationFolderFile()
 {
     if (mCurrentPath.isEmpty())
         return;
-    // Without an order, which a full disk did not take, the clean-up would count every title as deleted. The
-    // next start makes one from what the folder holds.
-    const QString order = mCurrentPath + QLatin1Char('/') + QLatin1String(TitleParser::ORDER_FILEPATH);
-    if (!isEmpty() && !QFile::exists(order))
+    // Without an order, which a full disk did not take, or with a torn one the clean-up would count every
+    // title as deleted. The next start makes one from what the folder holds.
+    const auto namesNothing = [this] { return mController->getFileOrder(mCurrentPath).empty(); };
+    if (!isEmpty() && namesNothing())
         saveArchiveListOrder();
-    if (QFile::exists(order))
+    const QString order = mCurrentPath + QLatin1Char('/') + QLatin1String(TitleParser::ORDER_FILEPATH);
+    TiXmlDocument document;
+    const bool isReadable = XmlFile::load(order.toStdString(), document);
+    if (isReadable && (isEmpty() || !namesNothing()))
         mController->deleteUnusefulArchives(mCurrentPath);
 }

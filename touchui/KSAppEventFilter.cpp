@@ -13,6 +13,8 @@
 namespace
 {
 
+KSAppEventFilter* gCurrent = nullptr;
+
 constexpr int HIGHEST_PRIORITY = 6;
 constexpr int NORMAL_PRIORITY = 3;
 constexpr int LOWEST_PRIORITY = 0;
@@ -43,13 +45,22 @@ qsizetype pointCount(const QEvent* event)
 
 } // namespace
 
+KSAppEventFilter* KSAppEventFilter::current()
+{
+    return gCurrent;
+}
+
 KSAppEventFilter::KSAppEventFilter(QObject* parent) : QObject(parent)
 {
+    gCurrent = this;
     KSAppEventFilter::clearActivateLockObject();
 }
 
 KSAppEventFilter::~KSAppEventFilter()
 {
+    if (gCurrent == this) {
+        gCurrent = nullptr;
+    }
     qDeleteAll(m_owned);
 }
 

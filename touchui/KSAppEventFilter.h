@@ -15,6 +15,9 @@ class KSAppEventFilter : public QObject
 {
     Q_OBJECT
 public:
+    // The filter that was made last and stands before the application's events; null when there is none.
+    static KSAppEventFilter* current();
+
     explicit KSAppEventFilter(QObject* parent = nullptr);
     // Deletes every lock object that was created here or given to keepNewLockObject.
     ~KSAppEventFilter() override;

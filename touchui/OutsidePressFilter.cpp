@@ -1,5 +1,7 @@
 #include "touchui/OutsidePressFilter.h"
 
+#include "touchui/KSAppEventFilter.h"
+
 #include <QCoreApplication>
 #include <QMouseEvent>
 #include <QTouchEvent>
@@ -12,17 +14,24 @@ OutsidePressFilter::OutsidePressFilter(QWidget* window, QObject* parent) : QObje
 void OutsidePressFilter::start()
 {
     m_watching = true;
-    // Anew each time: the filter that was installed last is asked first.
-    QCoreApplication::instance()->installEventFilter(this);
-    m_installed = true;
+    m_gate = KSAppEventFilter::current();
+    if (m_gate != nullptr) {
+        m_gate->registerEventFilter(this);
+    } else {
+        QCoreApplication::instance()->installEventFilter(this);
+    }
 }
 
 void OutsidePressFilter::stop()
 {
     m_watching = false;
-    if (!m_swallowsTouch && !m_swallowsMouse && m_installed) {
+    if (m_swallowsTouch || m_swallowsMouse) {
+        return;
+    }
+    if (m_gate != nullptr) {
+        m_gate->unegisterEventFilter(this);
+    } else {
         QCoreApplication::instance()->removeEventFilter(this);
-        m_installed = false;
     }
 }
 

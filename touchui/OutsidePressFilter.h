@@ -3,11 +3,14 @@
 #include <QObject>
 #include <QPointer>
 
+class KSAppEventFilter;
 class QEvent;
 class QWidget;
 
 // Closes what is open for the moment: tells of the first press or touch of this process outside a window, and
-// swallows that press and all that follows from it up to the lift, so that it presses nothing else.
+// swallows that press and all that follows from it up to the lift, so that it presses nothing else. It stands
+// behind the application's gate for touches: a touch that the gate refuses, such as a second finger's, closes
+// nothing, and one that it lets through holds its lock up to the lift.
 //
 // Such windows are of the type Qt::ToolTip and not Qt::Popup: while a popup is open, Qt delivers no touches,
 // and the finger that opened it would never be lifted for the widget under it.
@@ -35,7 +38,7 @@ private:
 
     QPointer<QWidget> m_window;
     bool m_watching = false;
-    bool m_installed = false;
+    QPointer<KSAppEventFilter> m_gate; // where it is registered, if there is one
     bool m_swallowsTouch = false;
     bool m_swallowsMouse = false;
     QPointer<QObject> m_swallowed; // the object that the press is kept from

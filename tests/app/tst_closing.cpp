@@ -13,14 +13,17 @@
 #include "library/ArchiveItem.h"
 #include "library/ArchiveList.h"
 #include "library/ArchiveMenu.h"
+#include "messaging/services/FileManagerControllerParams.h"
 #include "touchui/KSInputContext.h"
 
 #include <QApplication>
+#include <QDeadlineTimer>
 #include <QMetaEnum>
 #include <QPointingDevice>
 #include <QSet>
 #include <QTest>
 #include <QTextCursor>
+#include <QThread>
 
 namespace
 {
@@ -29,6 +32,9 @@ constexpr int ROW = 143;           // of the list, with the gap
 constexpr int HANDLE_X = 523;      // in the list
 constexpr int PICTURE_X = 150;     // likewise
 constexpr int LIFT_TIMEOUT = 5000; // ms
+constexpr int REPORT_TIMEOUT = 5000;
+const long FILE_MANAGER = 36;
+const long UPDATE_TITLER_STATUS = 72;
 const char* const PICTURES[] = {"_1920.png", "_960.png", "_240.png", "_240S.png"};
 
 // Text by object id.
@@ -76,6 +82,7 @@ private:
     void begin(Ending ending);
     void enter(State state);
     void end(Ending ending);
+    void verifyReports();
     void verifyAnswer(Ending ending);
     void verifyDisk();
 
@@ -137,6 +144,7 @@ void tst_Closing::init()
     mChanged.clear();
     mDraggedTo = {};
     mAnswers = {};
+    mSiblings.forget();
 }
 
 void tst_Closing::cleanup()
@@ -174,6 +182,7 @@ void tst_Closing::everyStateByEveryEnding()
     if (state != TitleCarried)
         mOrder = stems();
     end(ending);
+    verifyReports();
     verifyAnswer(ending);
     if (ending == PowerOff || ending == Signal) // what was deleted goes with the next Close of the folder
         ArchiveController().deleteUnusefulArchives(mFolder);
@@ -257,6 +266,26 @@ void tst_Closing::begin(Ending ending)
     mOrder = stems();
     QCOMPARE(mOrder.size(), 5);
     list()->selectArchive(0);
+}
+
+// The file manager hears of the new pictures although no event loop runs any more after the end.
+void tst_Closing::verifyReports()
+{
+    const auto reported = [this] {
+        QSet<QString> stems;
+        for (QByteArray arguments : mSiblings.argumentsOf(FILE_MANAGER, UPDATE_TITLER_STATUS)) {
+            FileManagerDefine::tagTitleChangeStatusParam notice;
+            FileManagerControllerParams::deserialize_updateTitlerStatus_param(notice, arguments.data(),
+                                                                              long(arguments.size()));
+            if (notice.changeType == FileManagerDefine::TITLE_PICTURES_CHANGED)
+                stems.insert(QFileInfo(QString::fromStdWString(notice.path)).completeBaseName());
+        }
+        return stems.contains(QSet<QString>(mChanged.cbegin(), mChanged.cend()));
+    };
+    const QDeadlineTimer limit(REPORT_TIMEOUT);
+    while (!reported() && !limit.hasExpired())
+        QThread::msleep(5);
+    QVERIFY(reported());
 }
 
 void tst_Closing::verifyAnswer(Ending ending)

@@ -150,6 +150,23 @@ class ByFinger(Buttons, harness.TitlerTest):
     def press(self, x, y):
         self.display.tap(x, y)
 
+    def test_a_text_left_empty_goes_with_the_next_tap(self):
+        title = self.titles(self.folder())[3]
+        before = title.texts()
+        # More often than a title has texts.
+        for _ in range(5):
+            start = self.appliance.mark()
+            self.use("New Text")
+            self.wait_keyboard(start)
+            self.press(*CORNER)
+            self.display.wait_until_still()
+            self.assertEqual(self.canvas(), self.fresh)
+            self.assertEqual(self.posted_messages(start), [])
+        start = self.appliance.mark()
+        self.use("Close")
+        self.wait_closed(start)
+        self.assertEqual(title.texts(), before)
+
     def test_a_finger_that_slides_off_a_button_does_not_use_it(self):
         start = self.appliance.mark()
         x, y = harness.TOOL_POINTS["New Text"]

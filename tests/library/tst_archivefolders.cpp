@@ -93,6 +93,8 @@ private slots:
     void orderFiles();
     void folderWithoutAnOrderGetsOneAtTheStart();
     void orderThatDoesNotFitCostsNoTitle();
+    void unreadableOrderCostsNoTitle_data();
+    void unreadableOrderCostsNoTitle();
     void skippedTitlesLeaveTheOrderAtTheNextChange();
     void unreadableFolder();
     void unwritableFolderMakesNoTitle();
@@ -234,6 +236,41 @@ void tst_ArchiveFolders::orderThatDoesNotFitCostsNoTitle()
 
     // It was opened without an order.
     QVERIFY(QFile::remove(folder + "/.order.xml"));
+    m->list->refreshArchiveList(folder);
+    QVERIFY(m->list->isEmpty());
+    m->list->synchronizationFolderFile();
+    assertAllThere();
+}
+
+void tst_ArchiveFolders::unreadableOrderCostsNoTitle_data()
+{
+    QTest::addColumn<QByteArray>("order");
+    QTest::newRow("no bytes") << QByteArray();
+    QTest::newRow("torn") << QByteArray("<root><archive index=\"0\" pat");
+    QTest::newRow("not UTF-8") << QByteArray("<root><archive path=\"\xff.xml\"/></root>");
+}
+
+void tst_ArchiveFolders::unreadableOrderCostsNoTitle()
+{
+    QFETCH(QByteArray, order);
+    const QString folder = abc(QStringLiteral("torn"));
+    const auto damage = [&] {
+        QFile file(folder + "/.order.xml");
+        QVERIFY(file.open(QIODevice::WriteOnly) && file.write(order) == order.size());
+    };
+    const auto assertAllThere = [&folder] {
+        for (const char* name : {"/a.xml", "/b.xml", "/c.xml"})
+            QVERIFY2(QFile::exists(folder + name), name);
+    };
+    // While its titles are shown: the list knows their order.
+    m->open(folder);
+    damage();
+    m->list->synchronizationFolderFile();
+    assertAllThere();
+    QCOMPARE(LibraryFixture::order(folder), m->stems());
+
+    // Before it was opened: there is nothing to show, and nothing to be sure of.
+    damage();
     m->list->refreshArchiveList(folder);
     QVERIFY(m->list->isEmpty());
     m->list->synchronizationFolderFile();

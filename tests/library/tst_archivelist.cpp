@@ -40,6 +40,7 @@ private slots:
     void menuOnAnItem();
     void wheelHidesTheMenu();
     void saveRefreshesTheItem();
+    void saveOvertakesTheFirstPicture();
     void textLinesOfOneAndOfManyObjects();
     void letterTailsAreWhole_data();
     void letterTailsAreWhole();
@@ -435,6 +436,20 @@ void tst_ArchiveList::saveRefreshesTheItem()
     QCOMPARE(shown.pixelColor(120, 70), QColor(Qt::green));
     mList->refreshBaseItem(folder + QStringLiteral("/unknown.xml"), picture); // nobody's
     mList->refreshBaseItem(QString(), QImage());
+}
+
+// The pictures of an earlier visit to the folder may become ready while its rows are still being built.
+void tst_ArchiveList::saveOvertakesTheFirstPicture()
+{
+    const QString folder = threeTitles(QStringLiteral("overtaken"));
+    mList->refreshArchiveList(folder);
+    QVERIFY(!item(1)->hasChildWidgets());
+    QImage picture(240, 135, QImage::Format_ARGB32_Premultiplied);
+    picture.fill(Qt::green);
+    mList->refreshBaseItem(folder + QStringLiteral("/a.xml"), picture);
+    QTRY_VERIFY(item(2)->hasChildWidgets());
+    QCOMPARE(item(1)->grab().toImage().pixelColor(120, 70), QColor(Qt::green));
+    QVERIFY(item(0)->grab().toImage().pixelColor(120, 70) != QColor(Qt::green));
 }
 
 void tst_ArchiveList::textLinesOfOneAndOfManyObjects()

@@ -1,5 +1,6 @@
 // Where files lie: the path file, the cursor that reads it, and the queries of the platform.
 #include "support/FileSyncQueue.h"
+#include "support/FolderLookup.h"
 #include "support/HiddenName.h"
 #include "support/IPathManagerEx.h"
 #include "support/PathManagerEx.h"
@@ -11,6 +12,7 @@
 #include <QRegularExpression>
 #include <QTemporaryDir>
 #include <QtTest/QTest>
+#include <boost/filesystem/exception.hpp>
 
 class TestPathManager : public QObject
 {
@@ -49,6 +51,21 @@ private slots:
         QCOMPARE(QString::fromStdWString(own.getMoviesPath()), base() + "movies");
         QCOMPARE(QString::fromStdWString(paths->getTmpPath()), base());
         QVERIFY(paths->getLogosPath().empty());
+    }
+
+    void folderThatCannotBeMadeIsNone()
+    {
+        writePathFile("<PathInfo><TitleResource path=\"taken/titles\"/><Font path=\"字体\"/></PathInfo>");
+        put((base() + "taken").toStdString(), "a file in the way");
+        QVERIFY_EXCEPTION_THROWN(IPathManagerEx::getInstance()->getTitleResourcesPath(),
+                                 boost::filesystem::filesystem_error);
+        QCOMPARE(FolderLookup::multiByte(&IPathManagerEx::getTitleResourcesPath), std::string());
+        QCOMPARE(FolderLookup::wide(&IPathManagerEx::getTitleResourcesPath), std::wstring());
+        QCOMPARE(FolderLookup::multiByte(&IPathManagerEx::getFontsPath), (base() + "字体").toStdString());
+        // There is no need to start anew once it can be made.
+        QVERIFY(QFile::remove(base() + "taken"));
+        QCOMPARE(FolderLookup::wide(&IPathManagerEx::getTitleResourcesPath),
+                 (base() + "taken/titles").toStdWString());
     }
 
     void everyGetterHasItsNode_data()

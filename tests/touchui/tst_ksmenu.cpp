@@ -3,6 +3,7 @@
 #include "touchui/KSMenu.h"
 #include "touchui/TouchEventButton.h"
 
+#include <QPushButton>
 #include <QSignalSpy>
 #include <QTest>
 #include <QTimer>
@@ -23,6 +24,7 @@ private Q_SLOTS:
     void otherButtonsChooseNothing();
     void pressOutsideClosesAndPressesNothing_data();
     void pressOutsideClosesAndPressesNothing();
+    void refusedFingerOutsideLeavesItOpen();
     void fingerThatOpenedItIsLiftedForItsWidget();
     void closesByItsTimer();
     void noTimeNoTimer();
@@ -196,6 +198,28 @@ void TestKSMenu::pressOutsideClosesAndPressesNothing()
     QVERIFY(!m_touch->isLocked());
     tapButton(); // the next one presses again
     QCOMPARE(clicked.count(), 1);
+    QVERIFY(!m_touch->isLocked());
+}
+
+// A touch that the locks refuse, here a second finger's, reaches nobody.
+void TestKSMenu::refusedFingerOutsideLeavesItOpen()
+{
+    QPushButton other(m_window.get());
+    other.setAttribute(Qt::WA_AcceptTouchEvents);
+    other.setGeometry(300, 500, 200, 80);
+    other.show();
+    m_touch->press(m_button, QPoint(20, 20));
+    open(QPoint(30, 300));
+    m_touch->press(&other, QPoint(20, 20), 1);
+    QVERIFY(m_menu->isVisible());
+    m_touch->lift(&other, QPoint(20, 20), 1);
+    m_touch->lift(m_button, QPoint(20, 20));
+    QVERIFY(m_menu->isVisible());
+    // Alone it is let in, holds its lock as any touch, and closes the menu.
+    m_touch->press(&other, QPoint(20, 20), 1);
+    QVERIFY(!m_menu->isVisible());
+    QVERIFY(m_touch->isLocked());
+    m_touch->lift(&other, QPoint(20, 20), 1);
     QVERIFY(!m_touch->isLocked());
 }
 
