@@ -123,10 +123,8 @@ bool ArchiveList::IsOptionMenuShowing() const
 
 void ArchiveList::slotHideOptionMenu()
 {
-    if (!IsOptionMenuShowing())
-        return;
-    mMenu->close();
-    sendTitlerAppEvent(false);
+    if (IsOptionMenuShowing())
+        mMenu->close(); // and with it slotMenuAboutToClose
 }
 
 void ArchiveList::slotMenuAboutToClose()
