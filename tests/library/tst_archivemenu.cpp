@@ -76,6 +76,7 @@ private slots:
     void choicesAreLogged_data();
     void choicesAreLogged();
     void choiceOnEmptyAreaIsLoggedWithTheLastTitle();
+    void savingTheShownTitleSelectsNothing();
     void templateIsReportedWithItsFolder();
     void fullTemplateListTellsTheFreeName_data();
     void fullTemplateListTellsTheFreeName();
@@ -236,6 +237,31 @@ void tst_ArchiveMenu::choiceOnEmptyAreaIsLoggedWithTheLastTitle()
     m->hold(List::PICTURE_X, 800);
     m->choose(ArchiveAction::ACTION_CREATE);
     QCOMPARE(newLogLines(), Names{QStringLiteral("[Thumbnail] 200: Select  Create New in the 2 Thumbnail")});
+}
+
+// It leaves the canvas for a moment to be written out, which is nothing that the operator did.
+void tst_ArchiveMenu::savingTheShownTitleSelectsNothing()
+{
+    openFolder(QStringLiteral("shown"), 20);
+    m->list->setFixedSize(549, 900);
+    m->list->selectArchive(7);
+    m->list->verticalScrollBar()->setValue(120); // the lower edge cuts the title
+    newLogLines();
+    m->takeCanvas();
+    QSignalSpy leaving(m->list, &ArchiveList::itemSetDefaultState);
+    QSignalSpy added(m->list, &ArchiveList::addUserSignal);
+    m->hold(List::PICTURE_X, 7 * List::ROW + 10 - 120);
+    QCOMPARE(m->value(), 120);
+    QCOMPARE(m->item(7)->styleSheet(), ArchiveItem::OPERATE_AND_SELECT_STATE);
+    m->choose(ArchiveAction::ACTION_ADD_USER);
+    QCOMPARE(added.size(), 1);
+    QCOMPARE(leaving.size(), 1);
+    QCOMPARE(newLogLines(), Names{QStringLiteral("[Thumbnail] 200: Select Add User in the 7 Thumbnail")});
+    QCOMPARE(m->value(), 120);
+    QCOMPARE(m->selected(), 7);
+    QVERIFY(m->item(7)->isSelected());
+    QCOMPARE(m->item(7)->styleSheet(), ArchiveItem::UN_OPERATE_AND_SELECT_STATE);
+    QCOMPARE(m->takeCanvas(), Names());
 }
 
 void tst_ArchiveMenu::templateIsReportedWithItsFolder()
