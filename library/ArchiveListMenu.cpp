@@ -320,6 +320,7 @@ void ArchiveList::translateText()
 {
     if (mMenu)
         mMenu->translateText();
-    if (mFolderLabel && mCurrentPath.isEmpty())
+    // A blank label is one of a folder that was closed.
+    if (mFolderLabel && mCurrentPath.isEmpty() && !mFolderLabel->text().isEmpty())
         mFolderLabel->setText(tr("Folder"));
 }

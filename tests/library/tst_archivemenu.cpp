@@ -80,6 +80,7 @@ private slots:
     void templateIsReportedWithItsFolder();
     void fullTemplateListTellsTheFreeName_data();
     void fullTemplateListTellsTheFreeName();
+    void blankLabelStaysBlank();
 
 private:
     QString openFolder(const QString& name, int titles)
@@ -295,6 +296,19 @@ void tst_ArchiveMenu::fullTemplateListTellsTheFreeName()
     m->holdAndChoose(0, ArchiveAction::ACTION_ADD_USER);
     QCOMPARE(mMessages.take(), messages);
     QCOMPARE(added.size(), messages.isEmpty() ? 1 : 0);
+}
+
+void tst_ArchiveMenu::blankLabelStaysBlank()
+{
+    m->label.setText(QStringLiteral("in another language"));
+    m->list->translateText();
+    QCOMPARE(m->label.text(), QStringLiteral("Folder"));
+    openFolder(QStringLiteral("named"), 1);
+    m->list->translateText();
+    QCOMPARE(m->label.text(), QStringLiteral("named"));
+    m->list->cleanArchiveList();
+    m->list->translateText();
+    QCOMPARE(m->label.text(), QString());
 }
 
 QTEST_MAIN(tst_ArchiveMenu)
