@@ -236,7 +236,7 @@ void tst_TitleFileOperations::templateFolderThatCannotBeMadeIsLogged()
     writeFile(root, "a file where the folder should be");
     {
         SystemLogCatcher log;
-        mFiles.createUserTemplate(root, QStringLiteral("UserTemplate_001"), *source);
+        QVERIFY(!mFiles.createUserTemplate(root, QStringLiteral("UserTemplate_001"), *source));
         QVERIFY2(log.text().contains("ERROR create dir."), log.text());
     }
     QCOMPARE(readFile(root), QByteArray("a file where the folder should be"));
