@@ -28,6 +28,7 @@ void ArchiveList::openFolder(const QString& path)
     mController->setLastFolderPath(path);
     setDefaultItemState(mSelectedItem);
     clearOperationItemState(mOperationItem);
+    // Each start notice needs its end, or the old folder would stay locked for the sibling processes.
     ITitlerFolderReporter* reporter = ITitlerFolderReporter::instance();
     if (reporter && !mCurrentPath.isEmpty())
         reporter->editFolderEndStatus(mCurrentPath);

@@ -123,10 +123,8 @@ bool ArchiveList::IsOptionMenuShowing() const
 
 void ArchiveList::slotHideOptionMenu()
 {
-    if (!IsOptionMenuShowing())
-        return;
-    mMenu->close();
-    sendTitlerAppEvent(false);
+    if (IsOptionMenuShowing())
+        mMenu->close(); // and with it slotMenuAboutToClose
 }
 
 void ArchiveList::slotMenuAboutToClose()
@@ -276,6 +274,8 @@ void ArchiveList::exeAddUserArchive()
     const QString root = QString::fromStdWString(IPathManagerEx::getInstance()->getTitlerTemplatesPath());
     const QString name = mController->getFreeNameInUserTemplate(root);
     const auto templates = static_cast<int>(mController->getFileOrder(root).size());
+    // Without a free name, which can be so from 998 rows on, the template would become a file among the
+    // folders.
     if (templates > ListMessages::TEMPLATE_LIMIT || name.isEmpty()) {
         ListMessages::post(MessageDef::MESSAGE_TEMPLATE_LIST_FULL, name);
         return;
@@ -296,13 +296,15 @@ void ArchiveList::exeAddUserArchive()
     emit startUserTemplatePicker();
 }
 
-// The title on the canvas must have been written out before it can be copied. It stays selected.
+// The title on the canvas must have been written out before it can be copied. It stays selected, which is not
+// a selection of the operator's: nothing is logged and nothing scrolls.
 void ArchiveList::waitForCanvas()
 {
     setDefaultItemState(mSelectedItem);
     while (mMainScene && !mMainScene->isEditFinish())
         ::sleep(1);
-    setSelectItemState(mSelectedItem);
+    mSelectedItem->setStyleSheet(ArchiveItem::UN_OPERATE_AND_SELECT_STATE);
+    mSelectedItem->setSelected(true);
 }
 
 void ArchiveList::setSystemLanFont(QString family)
@@ -318,6 +320,7 @@ void ArchiveList::translateText()
 {
     if (mMenu)
         mMenu->translateText();
-    if (mFolderLabel && mCurrentPath.isEmpty())
+    // A blank label is one of a folder that was closed.
+    if (mFolderLabel && mCurrentPath.isEmpty() && !mFolderLabel->text().isEmpty())
         mFolderLabel->setText(tr("Folder"));
 }

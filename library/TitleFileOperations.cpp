@@ -168,8 +168,13 @@ std::unique_ptr<Archive> TitleFileOperations::createUserTemplate(const QString& 
     if (root.isEmpty() || name.isEmpty())
         return nullptr;
     const QString folder = root + QLatin1Char('/') + name;
-    if (!SystemInfo::createFolders(folder.toStdWString()))
+    if (!SystemInfo::createFolders(folder.toStdWString())) {
         LOG_EVENT(L"ArchiveList", __LINE__, L"ERROR create dir.", 4);
+        // The folder of a template that was deleted is taken again. Without one the save, which is not told
+        // of a disk that refuses, would announce a template that is not there.
+        if (!QFileInfo(folder).isDir())
+            return nullptr;
+    }
 
     auto target = std::make_unique<Archive>(source);
     target->setName((name + QLatin1Char('/') + TEMPLATE_STEM).toStdString());

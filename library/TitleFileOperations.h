@@ -51,8 +51,8 @@ public:
                                             const TitlePictures& pictures) const;
 
     // Makes the folder of a user template of this name in the root and in it the title file, with copies of
-    // the small picture and the background. The record's name is "<name>/Titler". Null when the title file is
-    // refused.
+    // the small picture and the background. The record's name is "<name>/Titler". Null when there is no
+    // folder for it or the title file is refused.
     std::unique_ptr<Archive> createUserTemplate(const QString& root, const QString& name,
                                                 const Archive& source) const;
 

@@ -27,6 +27,7 @@ private slots:
     void missingFileSelectsTheFirst();
     void emptyAndMissingFolders();
     void createRequestOffersATemplate();
+    void createRequestForAMissingFileSelectsNothing();
     void fullFolderRefusesNewTitles();
     void fullDiskRefusesNewTitles();
     void autoInitTakesTheLastFolder();
@@ -45,8 +46,11 @@ private slots:
     void letterTailsAreWhole_data();
     void letterTailsAreWhole();
     void itemStyles();
+    void itemText_data();
+    void itemText();
     void cloneOfAnItem();
     void followsARenamedFolder();
+    void renamedEmptyFolderOffersATemplate();
     void changeOfFolderIsReported();
     void synchronizationRemovesWhatTheOrderDoesNotName();
     void cleaningForgetsTheFolder();
@@ -210,6 +214,26 @@ void tst_ArchiveList::createRequestOffersATemplate()
     mList->refreshArchiveListInFile(folder, QStringLiteral("a.xml"));
     QCOMPARE(picker.count(), 2);
     QCOMPARE(mList->getSelectedArchive(), item(1));
+}
+
+void tst_ArchiveList::createRequestForAMissingFileSelectsNothing()
+{
+    QSignalSpy picker(mList.get(), &ArchiveList::startTemplatePicker);
+    mContext.createNew = true;
+    mList->refreshArchiveListInFile(threeTitles(QStringLiteral("create missing")), QStringLiteral("z.xml"));
+    QCOMPARE(mList->count(), 3);
+    QVERIFY(!mList->getSelectedArchive());
+    QVERIFY(mCanvas.isEmpty());
+    QCOMPARE(picker.count(), 1);
+    QVERIFY(mMessages.take().isEmpty());
+
+    const QString full = mFixture.makeFolder(QStringLiteral("create missing in full"));
+    LibraryFixture::fillFolder(full, numbered(99));
+    mList->refreshArchiveListInFile(full, QStringLiteral("z.xml"));
+    QVERIFY(!mList->getSelectedArchive());
+    QVERIFY(mCanvas.isEmpty());
+    QCOMPARE(picker.count(), 1);
+    QCOMPARE(mMessages.take(), (Reports{{112, QStringLiteral("99")}}));
 }
 
 void tst_ArchiveList::fullFolderRefusesNewTitles()
@@ -545,6 +569,41 @@ void tst_ArchiveList::itemStyles()
     QVERIFY(!narrow.findChild<QGraphicsView*>());
 }
 
+void tst_ArchiveList::itemText_data()
+{
+    QTest::addColumn<int>("type");
+    QTest::addColumn<QSize>("line");
+    QTest::addColumn<QString>("lineStyle");
+    QTest::addColumn<QString>("areaStyle");
+    QTest::newRow("list") << int(ArchiveItem::LIST_ITEM) << QSize(254, 33)
+                          << " background: transparent; color:rgb(220, 220, 220);" << QString();
+    QTest::newRow("narrow") << int(ArchiveItem::NARROW_ITEM) << QSize(250, 24)
+                            << " background: transparent; color:rgb(178, 178, 178);"
+                            << " QWidget#mTextWidget { background:rgb(38, 38, 38); }";
+}
+
+void tst_ArchiveList::itemText()
+{
+    QFETCH(const int, type);
+    QFETCH(const QSize, line);
+    QFETCH(const QString, lineStyle);
+    QFETCH(const QString, areaStyle);
+    Archive archive;
+    ArchiveItem shown(&archive, type);
+    shown.initArchiveItemChildWidget();
+    const QWidget* area = shown.getRightChild();
+    QVERIFY(area);
+    QCOMPARE(area->objectName(), QStringLiteral("mTextWidget"));
+    QCOMPARE(area->styleSheet(), areaStyle);
+    QCOMPARE(area->size(), QSize(254, 135));
+    const QList<QLabel*> lines = area->findChildren<QLabel*>();
+    QCOMPARE(lines.size(), 4);
+    for (int i = 0; i < 4; ++i) {
+        QCOMPARE(lines.at(i)->geometry(), QRect(QPoint(0, i * line.height()), line));
+        QCOMPARE(lines.at(i)->styleSheet(), lineStyle);
+    }
+}
+
 void tst_ArchiveList::cloneOfAnItem()
 {
     auto archive =
@@ -568,14 +627,35 @@ void tst_ArchiveList::followsARenamedFolder()
     QDir().rmdir(after);
     QVERIFY(QDir().rename(before, after));
     mCanvas.clear();
+    mFolders.take();
     mList->refreshArchiveListForChangeFolderName(QStringLiteral("/another"), after);
     QCOMPARE(mList->getCurrentPath(), before);
     QVERIFY(mCanvas.isEmpty());
+    QVERIFY(mFolders.take().isEmpty());
     mList->refreshArchiveListForChangeFolderName(before, after);
     QCOMPARE(mList->getCurrentPath(), after);
     QCOMPARE(mList->getSelectedArchive(), item(1));
     QCOMPARE(mCanvas, (QStringList{QStringLiteral("a")}));
     QCOMPARE(ArchiveController().getLastFolderPath(), after);
+    QCOMPARE(mLabel->text(), QStringLiteral("after"));
+    QCOMPARE(mFolders.take(), (QStringList{QStringLiteral("start after")})); // the old one is no more
+}
+
+void tst_ArchiveList::renamedEmptyFolderOffersATemplate()
+{
+    const QString before = mFixture.makeFolder(QStringLiteral("empty before"));
+    const QString after = mFixture.makeFolder(QStringLiteral("empty after"));
+    mList->refreshArchiveList(before);
+    QVERIFY(QDir().rmdir(after));
+    QVERIFY(QDir().rename(before, after));
+    mCanvas.clear();
+    QSignalSpy picker(mList.get(), &ArchiveList::startTemplatePicker);
+    mList->refreshArchiveListForChangeFolderName(before, after);
+    QCOMPARE(picker.count(), 1);
+    QCOMPARE(mList->getCurrentPath(), after);
+    QCOMPARE(mLabel->text(), QStringLiteral("empty after"));
+    QVERIFY(!mList->getSelectedArchive());
+    QVERIFY(mCanvas.isEmpty()); // it is empty already
 }
 
 void tst_ArchiveList::changeOfFolderIsReported()
@@ -667,6 +747,10 @@ void tst_ArchiveList::language()
 {
     mList->refreshArchiveList(threeTitles(QStringLiteral("language")));
     QTRY_VERIFY(item(2)->hasChildWidgets());
+    QTest::mouseClick(item(1), Qt::RightButton, Qt::NoModifier, QPoint(20, 20));
+    QCOMPARE(menu()->font().family(), QStringLiteral("KST"));
+    QCOMPARE(menu()->font().pixelSize(), 28);
+    mList->slotHideOptionMenu();
     mList->translateText();
     mList->setSystemLanFont(QStringLiteral("DFHeiW5-A"));
     const QFont font = item(0)->getRightChild()->findChild<QLabel*>()->font();
@@ -674,6 +758,7 @@ void tst_ArchiveList::language()
     QCOMPARE(font.pixelSize(), 28);
     QTest::mouseClick(item(1), Qt::RightButton, Qt::NoModifier, QPoint(20, 20));
     QCOMPARE(menu()->font().family(), QStringLiteral("DFHeiW5-A"));
+    QCOMPARE(menu()->font().pixelSize(), 28);
     mList->setSystemLanFont(QStringLiteral("KST"));
 }
 

@@ -3,8 +3,50 @@
 
 #include "library/TitleFileOperations.h"
 #include "library/TitlerUtility.h"
+#include "support/LogManager.h"
 
+#include <QTemporaryFile>
 #include <QTest>
+#include <syslog.h>
+#include <unistd.h>
+
+namespace
+{
+
+// What goes to the system log while it lives, on its way through the standard error channel.
+class SystemLogCatcher
+{
+public:
+    SystemLogCatcher()
+    {
+        if (!mFile.open())
+            qFatal("no file for the log");
+        INIT_LOGGING(L"KS2Titler");
+        ::openlog("KS2Titler", LOG_PERROR, LOG_USER);
+        mBefore = ::dup(STDERR_FILENO);
+        ::dup2(mFile.handle(), STDERR_FILENO);
+    }
+    ~SystemLogCatcher()
+    {
+        ::dup2(mBefore, STDERR_FILENO);
+        ::close(mBefore);
+        ::closelog();
+        UNINIT_LOGGING();
+    }
+    Q_DISABLE_COPY_MOVE(SystemLogCatcher)
+
+    QByteArray text()
+    {
+        mFile.seek(0);
+        return mFile.readAll();
+    }
+
+private:
+    QTemporaryFile mFile;
+    int mBefore = -1;
+};
+
+} // namespace
 
 class tst_TitleFileOperations : public QObject
 {
@@ -20,6 +62,7 @@ private slots:
     void copySurvivesItsSource();
     void copyWithoutPicturesMakesTheTitleAlone();
     void noFileIsLeftAside();
+    void templateFolderThatCannotBeMadeIsLogged();
 
 private:
     static void writeFile(const QString& path, const QByteArray& bytes)
@@ -183,6 +226,25 @@ void tst_TitleFileOperations::noFileIsLeftAside()
     pictures.big = pictures.middle = pictures.black = pictures.small = QByteArray("picture");
     QVERIFY(mFiles.createFromCopy(folder, *source, pictures));
     QCOMPARE(QDir(folder).entryList(QDir::Files | QDir::Hidden).size(), 5);
+}
+
+void tst_TitleFileOperations::templateFolderThatCannotBeMadeIsLogged()
+{
+    const QString folder = mFixture.makeFolder(QStringLiteral("no template folder"));
+    const auto source = LibraryFixture::makeRecord(folder, QStringLiteral("s"), QStringLiteral("A"));
+    const QString root = folder + QStringLiteral("/templates");
+    writeFile(root, "a file where the folder should be");
+    {
+        SystemLogCatcher log;
+        QVERIFY(!mFiles.createUserTemplate(root, QStringLiteral("UserTemplate_001"), *source));
+        QVERIFY2(log.text().contains("ERROR create dir."), log.text());
+    }
+    QCOMPARE(readFile(root), QByteArray("a file where the folder should be"));
+
+    const QString good = mFixture.makeFolder(QStringLiteral("template folder"));
+    SystemLogCatcher log;
+    QVERIFY(mFiles.createUserTemplate(good, QStringLiteral("UserTemplate_001"), *source));
+    QVERIFY2(!log.text().contains("ERROR"), log.text());
 }
 
 QTEST_GUILESS_MAIN(tst_TitleFileOperations)
