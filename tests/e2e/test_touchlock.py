@@ -94,6 +94,14 @@ class TouchLock(harness.TitlerTest):
         self.lock(REMEMBERED, False)
         self.assert_fingers_work()
 
+    def test_a_sibling_that_asks_to_give_way_hears_of_every_control(self):
+        start = self.appliance.mark()
+        self.command(f"restore-original {SIBLING}")
+        # Move mode, the slider of the edge, the Canvas menu and the two font lists, whether they are open or not.
+        wanted = [(REMEMBERED, False)] * 5
+        session.wait_until(lambda: self.locks(start) == wanted, 20 * harness.SLOW, "the notices")
+        self.assert_fingers_work()
+
     def test_a_siblings_lock_breaks_the_touch_that_goes_on(self):
         self.display.down(*harness.TOOL_POINTS["Safe Area"])
         self.lock(TOUCHED, True)
