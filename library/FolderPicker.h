@@ -108,6 +108,8 @@ public slots:
     void pressedFolder(QModelIndex indexPress);
     void startEditing(QModelIndex index);
     void slotCurrentChangedByTouch(QModelIndex index);
+    // The rows are sorted by the column now.
+    void slotHeaderClicked(int column);
 
     // The editor.
     void slotCreateEditor(FolderEditor* editor);
@@ -150,6 +152,8 @@ private:
 
     bool checkItemisFolder(const QModelIndex& index) const;
     QModelIndex folderOf(const QModelIndex& index) const;
+    // The current row is a title in that folder, which is closed.
+    bool isHiddenBy(const QModelIndex& folder) const;
     QString nameOf(const QModelIndex& index) const;
     QModelIndex getFolderIndex(const QString& name, const QModelIndex& skipped = QModelIndex()) const;
     bool checkFolderNameIsExist(const QString& name) const;
