@@ -156,6 +156,8 @@ private:
     bool isHiddenBy(const QModelIndex& folder) const;
     QString nameOf(const QModelIndex& index) const;
     QModelIndex getFolderIndex(const QString& name, const QModelIndex& skipped = QModelIndex()) const;
+    // A name that comes from another process stands for the folder.
+    bool isNameOf(const QString& name, const QString& folder) const;
     bool checkFolderNameIsExist(const QString& name) const;
     bool checkDiskSpaceIsFull(const QString& path, bool withFolderSize) const;
     bool checkCanShowTemplate(const QModelIndex& index) const;
