@@ -1,5 +1,5 @@
-// The operation log of one test program, in a folder of its own. Make it before QApplication, with which the
-// logging starts.
+// The operation log and the debug log of one test program, in a folder of its own. Make it before
+// QApplication, with which the logging starts.
 #pragma once
 
 #include <QFile>
@@ -12,14 +12,21 @@ public:
     OperationLog() { qputenv("K2SYS_LOG_DIR", m_folder.path().toLocal8Bit()); }
 
     // "number: text" of the area's entries. What was written before the last call, in whatever area, is gone.
-    QStringList take(const QString& area)
+    QStringList take(const QString& area) { return read(QStringLiteral("k2_ope.log"), m_position, area); }
+    QStringList takeDebug(const QString& area)
     {
-        QFile file(m_folder.filePath(QStringLiteral("k2_ope.log")));
-        if (!file.open(QIODevice::ReadOnly) || !file.seek(m_position))
+        return read(QStringLiteral("k2_ope_debug.log"), m_debugPosition, area);
+    }
+
+private:
+    QStringList read(const QString& name, qint64& position, const QString& area) const
+    {
+        QFile file(m_folder.filePath(name));
+        if (!file.open(QIODevice::ReadOnly) || !file.seek(position))
             return {QStringLiteral("no log")};
         const QStringList lines =
             QString::fromUtf8(file.readAll()).split(QLatin1Char('\n'), Qt::SkipEmptyParts);
-        m_position = file.pos();
+        position = file.pos();
         const QString mark = QStringLiteral("]: [") + area + QStringLiteral("] ");
         QStringList entries;
         for (const QString& line : lines) {
@@ -30,7 +37,7 @@ public:
         return entries;
     }
 
-private:
     QTemporaryDir m_folder;
     qint64 m_position = 0;
+    qint64 m_debugPosition = 0;
 };
