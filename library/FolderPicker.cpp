@@ -167,6 +167,7 @@ void FolderPicker::connectTree()
     connect(mTree, &QTreeView::expanded, this, &FolderPicker::pressedFolder);
     connect(mTree, &KSTreeView::signalCurrentChangedByTouch, this, &FolderPicker::slotCurrentChangedByTouch);
     connect(mTree, &KSTreeView::signalPressedAndHold, this, &FolderPicker::startEditing);
+    connect(mTree->header(), &QHeaderView::sectionClicked, this, &FolderPicker::slotHeaderClicked);
     connect(mTree->treeDelegate(), &CustomTreeDelegete::signalLineEditCommitted, this, &FolderPicker::doEdit);
     connect(mFactory, &FolderPickerFactory::signalCreateEditor, this, &FolderPicker::slotCreateEditor);
     for (QObject* object : std::initializer_list<QObject*>{mTree, mTree->viewport(), mTree->header(),

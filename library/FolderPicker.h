@@ -108,6 +108,8 @@ public slots:
     void pressedFolder(QModelIndex indexPress);
     void startEditing(QModelIndex index);
     void slotCurrentChangedByTouch(QModelIndex index);
+    // The rows are sorted by the column now.
+    void slotHeaderClicked(int column);
 
     // The editor.
     void slotCreateEditor(FolderEditor* editor);
@@ -150,8 +152,12 @@ private:
 
     bool checkItemisFolder(const QModelIndex& index) const;
     QModelIndex folderOf(const QModelIndex& index) const;
+    // The current row is a title in that folder, which is closed.
+    bool isHiddenBy(const QModelIndex& folder) const;
     QString nameOf(const QModelIndex& index) const;
     QModelIndex getFolderIndex(const QString& name, const QModelIndex& skipped = QModelIndex()) const;
+    // A name that comes from another process stands for the folder.
+    bool isNameOf(const QString& name, const QString& folder) const;
     bool checkFolderNameIsExist(const QString& name) const;
     bool checkDiskSpaceIsFull(const QString& path, bool withFolderSize) const;
     bool checkCanShowTemplate(const QModelIndex& index) const;

@@ -16,6 +16,7 @@
 #include "touchui/KSVIEW.h"
 
 #include <QEvent>
+#include <QHeaderView>
 
 namespace
 {
@@ -167,9 +168,10 @@ void FolderPicker::pressedFolder(QModelIndex indexPress)
 {
     if (!indexPress.isValid())
         return;
-    // Opening and closing a folder picks it, so that the buttons act on what was touched last.
+    // Opening and closing a folder picks it, so that the buttons act on what was touched last. A title of it
+    // that was chosen stays so for as long as it can be seen.
     const QPersistentModelIndex pressed = indexPress.siblingAtColumn(FolderPickerFactory::NameColumn);
-    if (folderOf(mTree->currentIndex()) != folderOf(pressed))
+    if (folderOf(mTree->currentIndex()) != folderOf(pressed) || isHiddenBy(pressed))
         mTree->setCurrentIndex(pressed);
     mPressedIndex = pressed;
     const QModelIndex current = mTree->currentIndex();
@@ -183,9 +185,23 @@ void FolderPicker::pressedFolder(QModelIndex indexPress)
     updateThumbnailArea(mFactory->getNodeInfo(item->dataItem()->getSourceData()).filePath());
 }
 
+bool FolderPicker::isHiddenBy(const QModelIndex& folder) const
+{
+    return mTree->currentIndex().parent() == folder && !mTree->isExpanded(folder);
+}
+
 void FolderPicker::slotCurrentChangedByTouch(QModelIndex)
 {
     logTap(L"Select Folder or File");
+}
+
+void FolderPicker::slotHeaderClicked(int column)
+{
+    const QString name = mModel->headerData(column, Qt::Horizontal).toString();
+    const bool ascending = mTree->header()->sortIndicatorOrder() == Qt::AscendingOrder;
+    LOG_USER_OPERATE(L"File List", 200,
+                     L"Sort by Column: " + name.toStdWString() +
+                         (ascending ? L" in AscendingOrder order" : L" in DescendingOrder order"));
 }
 
 void FolderPicker::startEditing(QModelIndex index)
@@ -259,8 +275,8 @@ void FolderPicker::openFolder()
     if (mEditing && renameAction())
         return;
     const QModelIndex current = mTree->currentIndex().siblingAtColumn(FolderPickerFactory::NameColumn);
-    if (!current.isValid() || isVanished(current) || !checkCanCreateNew(current) ||
-        !checkCanShowTemplate(current))
+    if (!current.isValid() || isVanished(current) || !checkCanShowTemplate(current) ||
+        !checkCanCreateNew(current))
         return;
     const QString name = nameOf(folderOf(current));
     mKeepDialog = false;

@@ -50,6 +50,14 @@ void FolderPicker::updateTreeView()
     setEditable(mCurrentFolderName, false);
 }
 
+// The name may come in another case, except where it is the very name of another folder.
+bool FolderPicker::isNameOf(const QString& name, const QString& folder) const
+{
+    if (folder.isEmpty() || !FolderNameRules::isSameName(name, folder))
+        return false;
+    return name == folder || nameOf(getFolderIndex(name)) != name;
+}
+
 void FolderPicker::folderNameChanged(FileManagerDefine::tagChangeFolderNameParam param)
 {
     const QString before = plainName(param.oldPath);
@@ -57,7 +65,7 @@ void FolderPicker::folderNameChanged(FileManagerDefine::tagChangeFolderNameParam
     if (!FolderNameRules::isFolderName(before) || !FolderNameRules::isFolderName(after))
         return;
     regetRootPath();
-    if (!mCurrentFolderName.isEmpty() && FolderNameRules::isSameName(before, mCurrentFolderName)) {
+    if (isNameOf(before, mCurrentFolderName)) {
         mCurrentFolderName = after;
         emit folderNameChange(folderPath(before), folderPath(after));
         // The steps back speak of the old path, also that of a text that was just being typed.
@@ -68,7 +76,7 @@ void FolderPicker::folderNameChanged(FileManagerDefine::tagChangeFolderNameParam
     if (mAction == FOLDER_EDIT_DUPLICATE && mDuplicateSource == folderPath(before))
         mDuplicateSource = folderPath(after);
     mFactory->renameFolder(before, after);
-    if (mAction == FOLDER_EDIT_RENAME && FolderNameRules::isSameName(before, mOldName)) {
+    if (mAction == FOLDER_EDIT_RENAME && isNameOf(before, mOldName)) {
         continuefolderNameChanged(after);
         return;
     }
@@ -98,7 +106,7 @@ void FolderPicker::continuefolderNameChanged(QString after)
 void FolderPicker::slotDeleteFolder(std::wstring name)
 {
     const QString folder = plainName(name);
-    if (!mCurrentFolderName.isEmpty() && FolderNameRules::isSameName(folder, mCurrentFolderName))
+    if (isNameOf(folder, mCurrentFolderName))
         setCurrentFolderName(QString());
     // A folder that is only being made is none yet.
     const bool isMade = mAction != FOLDER_EDIT_CREATE && mAction != FOLDER_EDIT_DUPLICATE;

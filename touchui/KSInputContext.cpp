@@ -136,6 +136,16 @@ QLineEdit* lineEditOf(QWidget* widget)
     return qobject_cast<QLineEdit*>(widget);
 }
 
+// An entry is one line, and keys such as Enter and Backspace bring signs that are no text.
+void logTypedText(QString text)
+{
+    const auto isControl = [](QChar sign) { return sign.category() == QChar::Other_Control; };
+    if (!std::all_of(text.cbegin(), text.cend(), isControl)) {
+        std::replace_if(text.begin(), text.end(), isControl, QLatin1Char(' '));
+        LOG_USER_OPERATE(L"Text Input", 200, text.toStdWString());
+    }
+}
+
 // X11 gives the keyboard to windows, and windows of the keyboard service may have taken it.
 void giveInputFocus(unsigned long window)
 {
@@ -509,6 +519,7 @@ void KSInputContext::handleInputString(const std::wstring& text, bool onEnter)
 void KSInputContext::handleInputStringOfQGraphicsView(QGraphicsView* view, const QString& text)
 {
     if (QGraphicsTextItem* item = getFocusTextItem(view)) {
+        logTypedText(text);
         QTextCursor cursor = item->textCursor();
         cursor.insertText(text);
     }
@@ -520,6 +531,7 @@ void KSInputContext::handleInputStringOfQLineEdit(QLineEdit* edit, const QString
         checkInputString(edit, text);
         return;
     }
+    logTypedText(text);
     edit->selectAll();
     edit->insert(text);
     edit->end(false);
@@ -582,6 +594,9 @@ void KSInputContext::sendKey(tagSoftKeyBoardKeyData data)
     QKeyEvent key(static_cast<QEvent::Type>(data.eventType), data.key,
                   Qt::KeyboardModifiers::fromInt(data.modifiers), QString::fromStdWString(data.text), false,
                   1);
+    if (key.type() == QEvent::KeyPress) {
+        logTypedText(key.text());
+    }
     {
         const QScopedValueRollback<bool> sending(m_sendingKeyEvent, true);
         QCoreApplication::sendEvent(target, &key);

@@ -316,6 +316,66 @@ private slots:
         QCOMPARE(f.current(), QStringLiteral("a"));
     }
 
+    // --- Names that differ in case alone --------------------------------------------------------------
+
+    void changesBesideTheOpenFolder_data()
+    {
+        QTest::addColumn<bool>("shown");
+        QTest::newRow("shown") << true;
+        QTest::newRow("hidden") << false;
+    }
+
+    void changesBesideTheOpenFolder()
+    {
+        QFETCH(bool, shown);
+        f.make("A", {"t9"});
+        f.picker->updateTreeView();
+        f.picker->setCurrentFolderName("A");
+        f.picker->setVisible(shown);
+        QSignalSpy change(f.picker.get(), &FolderPicker::folderNameChange);
+        QSignalSpy clear(f.picker.get(), &FolderPicker::clearUndoCommandStack);
+        renameOutside("a", "later");
+        QCOMPARE(f.picker->currentFolderName(), QStringLiteral("A"));
+        QCOMPARE(change.count(), 0);
+        QCOMPARE(clear.count(), 0);
+        renameOutside("later", "a");
+        deleteOutside("a");
+        QCOMPARE(f.picker->currentFolderName(), QStringLiteral("A"));
+        QCOMPARE(f.names(), QStringList({"A", "b", "c"}));
+        QVERIFY(!f.isEditable("A"));
+        // With the other one gone, the name can mean none but the open folder.
+        QVERIFY(QDir(f.root()).rename("A", "new"));
+        notify("a", "new");
+        QCOMPARE(f.picker->currentFolderName(), QStringLiteral("new"));
+        QCOMPARE(change.count(), 1);
+        QCOMPARE(clear.count(), 1);
+    }
+
+    void deletionOfTheOpenFolderInAnotherCase()
+    {
+        f.picker->setCurrentFolderName("a");
+        QDir(f.path("a")).removeRecursively();
+        f.picker->slotDeleteFolder(L"A");
+        QCOMPARE(f.picker->currentFolderName(), QString());
+        QCOMPARE(f.names(), QStringList({"b", "c"}));
+    }
+
+    void renameBesideTheNameThatIsBeingTyped()
+    {
+        f.make("A", {"t9"});
+        f.picker->updateTreeView();
+        f.hold("A");
+        renameOutside("a", "later");
+        QVERIFY(f.picker->editor());
+        QCOMPARE(f.picker->editor()->text(), QStringLiteral("A"));
+        f.reports.take();
+        f.enter("mine");
+        QCOMPARE(f.reports.take(), QStringList{"renamed A to mine"});
+        QCOMPARE(f.folders(), QStringList({"b", "c", "later", "mine"}));
+        QCOMPARE(f.names(f.row("mine")), QStringList{"t9"});
+        QCOMPARE(f.names(f.row("later")), QStringList({"t1", "t2"}));
+    }
+
     // --- Folders that come ----------------------------------------------------------------------------
 
     void importsShowWithTheNextReading()

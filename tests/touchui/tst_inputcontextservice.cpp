@@ -1,11 +1,16 @@
 // What the soft keyboard service sends to fields.
+#include "support/LogManager.h"
 #include "tests/touchui/InputContextFixture.h"
+#include "tests/touchui/OperationLog.h"
 
 using namespace SubCommonDefine;
 
 class TestInputContextService : public InputContextFixture
 {
     Q_OBJECT
+
+public:
+    explicit TestInputContextService(OperationLog& log) : m_log(log) {}
 
 private Q_SLOTS:
     void stringsIntoALineEdit();
@@ -25,6 +30,20 @@ private Q_SLOTS:
     void innerMethodGetsTheKeysWhileClosed();
     void fieldDeletedUnderTheKeyboard();
     void focusManagerWithoutAServer();
+    void typedTextIsLogged();
+    void textOfTheCanvasIsLogged();
+    void whatIsNoTypedTextIsNotLogged();
+
+private:
+    // Contexts that other tests make end the logging with them.
+    void startLog()
+    {
+        INIT_LOGGING(L"KS2Titler");
+        typed();
+    }
+    QStringList typed() { return m_log.take(QStringLiteral("Text Input")); }
+
+    OperationLog& m_log;
 };
 
 void TestInputContextService::stringsIntoALineEdit()
@@ -376,11 +395,69 @@ void TestInputContextService::focusManagerWithoutAServer()
     }
 }
 
+void TestInputContextService::typedTextIsLogged()
+{
+    startLog();
+    open(m_edit);
+    m_context->sendInputStringOnEnterPressing(L"快讯 1");
+    QCOMPARE(typed(), QStringList{QStringLiteral("200: 快讯 1")});
+    m_context->sendKey(keyRecord(QEvent::KeyPress, Qt::Key_A, L"a"));
+    m_context->sendKey(keyRecord(QEvent::KeyRelease, Qt::Key_A, L"a"));
+    m_context->sendKey(keyRecord(QEvent::KeyPress, Qt::Key_Space, L" "));
+    QCOMPARE(m_edit->text(), QStringLiteral("快讯 1a "));
+    QCOMPARE(typed(), QStringList({"200: a", "200:  "}));
+    open(m_box);
+    m_context->sendInputStringOnEnterPressing(L"72");
+    m_context->sendKey(keyRecord(QEvent::KeyPress, Qt::Key_0, L"0"));
+    QCOMPARE(typed(), QStringList({"200: 72", "200: 0"}));
+}
+
+void TestInputContextService::textOfTheCanvasIsLogged()
+{
+    startLog();
+    m_item->setFocus();
+    open(m_view);
+    m_context->sendInputString(L"속보");
+    m_context->sendInputStringOnEnterPressing(L"!");
+    m_context->sendKey(keyRecord(QEvent::KeyPress, Qt::Key_E, L"é"));
+    QCOMPARE(typed(), QStringList({QStringLiteral("200: 속보"), "200: !", QStringLiteral("200: é")}));
+    // An entry stays one line, and cannot pass itself off as another one.
+    m_context->sendInputString(L"one\nx localhost KS2Titler[1]: [Text Input] 200: two");
+    QCOMPARE(m_item->document()->blockCount(), 2);
+    QCOMPARE(typed().size(), 1);
+}
+
+void TestInputContextService::whatIsNoTypedTextIsNotLogged()
+{
+    startLog();
+    m_context->sendInputString(L"a"); // no field
+    open(m_edit);
+    // Only asked about, while the operator goes on typing.
+    m_context->sendInputString(L"a");
+    m_context->sendInputStringOnTextChanged(L"a");
+    m_context->sendInputStringOnEnterPressing(L"");
+    m_context->sendKey(keyRecord(QEvent::KeyPress, Qt::Key_Left));
+    m_context->sendKey(keyRecord(QEvent::KeyPress, Qt::Key_Backspace, L"\b"));
+    m_context->sendKey(keyRecord(QEvent::KeyPress, Qt::Key_Delete, L"\x7f"));
+    m_context->sendKey(keyRecord(QEvent::KeyPress, Qt::Key_Enter, L"\r"));
+    open(m_box);
+    m_box->setEditable(false);
+    m_context->sendInputStringOnEnterPressing(L"a");
+    m_item->setTextInteractionFlags(Qt::NoTextInteraction);
+    open(m_view);
+    m_context->sendInputString(L"a");
+    QCOMPARE(typed(), QStringList());
+    m_item->setTextInteractionFlags(Qt::TextEditorInteraction);
+    m_context->sendInputString(L"b");
+    QCOMPARE(typed(), QStringList{"200: b"});
+}
+
 int main(int argc, char** argv)
 {
+    OperationLog log;
     KSInputContext::install();
     QApplication app(argc, argv);
-    TestInputContextService test;
+    TestInputContextService test(log);
     QTEST_SET_MAIN_SOURCE_PATH
     return QTest::qExec(&test, argc, argv);
 }
