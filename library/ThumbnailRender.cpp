@@ -12,6 +12,7 @@
 #include <QPainter>
 #include <QPixmap>
 #include <QPoint>
+#include <string>
 
 const QSize ThumbnailRender::THUMBNAIL_BIG_SIZE(1920, 1080);
 const QSize ThumbnailRender::THUMBNAIL_MID_SIZE(1280, 720);
@@ -186,9 +187,12 @@ void ThumbnailRender::drawNextBigPicture()
 
 void ThumbnailRender::deleteOldFile(const Archive& archive)
 {
-    QFile file(QString::fromStdString(
-        TitlerUtility::getThumbnailPathFromTitlePath(archive.getPath(), archive.getThumbnailBig())));
-    if (!archive.getThumbnailBig().empty() && file.exists() && !file.isOpen())
+    const std::string path =
+        TitlerUtility::getPicturePathFromTitlePath(archive.getPath(), archive.getThumbnailBig());
+    if (path.empty())
+        return;
+    QFile file(QString::fromStdString(path));
+    if (file.exists() && !file.isOpen())
         file.remove();
 }
 

@@ -39,6 +39,8 @@ private slots:
     void hugeBackgroundGivesPicturesOfTheUsualSize();
     void slowStageWritesFourFiles();
     void slowStageRemovesTheOldBigPicture();
+    void slowStageRemovesNothingElse_data();
+    void slowStageRemovesNothingElse();
     void slowStageDrawsWhileTheEventsGoOn();
     void waitingWithoutEventsDrawsWhatIsLeft();
     void textsStandAtOneAndAHalfTimesTheirPlace();
@@ -191,6 +193,42 @@ void tst_ThumbnailRender::slowStageRemovesTheOldBigPicture()
     const auto archive = LibraryFixture::makeRecord(folder, QStringLiteral("t"), QString());
     paint(folder + QStringLiteral("/t_1920.png"), QSize(10, 10), Qt::red);
     QCOMPARE(slowPicture(*archive, "_1920.png").size(), QSize(1920, 1080));
+}
+
+void tst_ThumbnailRender::slowStageRemovesNothingElse_data()
+{
+    QTest::addColumn<QString>("name");
+    QTest::newRow("of another folder") << "../neighbour/x.png";
+    QTest::newRow("absolute") << mFixture.titleRoot() + "/neighbour/x.png";
+    QTest::newRow("another title") << "other.xml";
+    QTest::newRow("another title in capitals") << "OTHER.XML";
+    QTest::newRow("the title itself") << "t.xml";
+    QTest::newRow("the order") << ".order.xml";
+}
+
+void tst_ThumbnailRender::slowStageRemovesNothingElse()
+{
+    QFETCH(QString, name);
+    const QString neighbour = mFixture.makeFolder(QStringLiteral("neighbour"));
+    paint(neighbour + QStringLiteral("/x.png"), QSize(10, 10), Qt::red);
+    const QString folder = mFixture.makeFolder(QStringLiteral("foreign"));
+    LibraryFixture::fillFolder(folder, {QStringLiteral("t"), QStringLiteral("other")});
+    QVERIFY(QFile::copy(folder + QStringLiteral("/other.xml"), folder + QStringLiteral("/OTHER.XML")));
+    const auto archive = LibraryFixture::makeRecord(folder, QStringLiteral("t"), QStringLiteral("Foreign"));
+    archive->setThumbnailBig(name.toStdString());
+    const QString named = QDir(folder).absoluteFilePath(name);
+    QFile file(named);
+    QVERIFY(file.open(QIODevice::ReadOnly));
+    const QByteArray before = file.readAll();
+    file.close();
+
+    ThumbnailRender render;
+    render.makeThumbnail(archive.get(), true);
+    QVERIFY(QFile::exists(named));
+    QTRY_VERIFY_WITH_TIMEOUT(render.makePictureThreadIsFinished(), 20000);
+    QVERIFY(file.open(QIODevice::ReadOnly));
+    QCOMPARE(file.readAll(), before);
+    QVERIFY(QFile::exists(folder + QStringLiteral("/t_960.png")));
 }
 
 // Nobody asks whether it has finished.
