@@ -6,6 +6,7 @@
 #include "document/Archive.h"
 #include "document/TText.h"
 #include "library/TitlerUtility.h"
+#include "support/LogManager.h"
 
 #include <QFile>
 #include <QGraphicsDropShadowEffect>
@@ -39,6 +40,15 @@ void limitTextsToRaster(const QGraphicsScene& scene)
         if (item->type() == GraphicsText::Type)
             static_cast<GraphicsText*>(item)->setBoundingRectFlag(true);
     }
+}
+
+void logBoundingRect(const GraphicsText& text, int id)
+{
+    const QRect rect = text.sceneBoundingRect().toAlignedRect();
+    LOG_DEBUG_OPERATE(L"ThumbnailRender", 200,
+                      L"text " + std::to_wstring(id) + L" boundingRect " + std::to_wstring(rect.x()) + L',' +
+                          std::to_wstring(rect.y()) + L' ' + std::to_wstring(rect.width()) + L'x' +
+                          std::to_wstring(rect.height()));
 }
 
 QImage renderScene(QGraphicsScene& scene, QSize size)
@@ -116,6 +126,7 @@ void ThumbnailRender::createMiddleSizeCanvasSceneUsingArchiveData(const Archive&
             shadow->setColor(DROP_SHADOW_COLOR);
         mTexts.append(text);
         mMiddleScene.addItem(text);
+        logBoundingRect(*text, record->getTextObjectID());
     }
     limitTextsToRaster(mMiddleScene);
 }
