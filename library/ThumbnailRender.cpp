@@ -44,11 +44,16 @@ void limitTextsToRaster(const QGraphicsScene& scene)
 
 void logBoundingRect(const GraphicsText& text, int id)
 {
-    const QRect rect = text.sceneBoundingRect().toAlignedRect();
+    // A damaged file may tell places that no integer holds.
+    const QRectF rect = text.sceneBoundingRect();
     LOG_DEBUG_OPERATE(L"ThumbnailRender", 200,
-                      L"text " + std::to_wstring(id) + L" boundingRect " + std::to_wstring(rect.x()) + L',' +
-                          std::to_wstring(rect.y()) + L' ' + std::to_wstring(rect.width()) + L'x' +
-                          std::to_wstring(rect.height()));
+                      QStringLiteral("text %1 boundingRect %2,%3 %4x%5")
+                          .arg(id)
+                          .arg(rect.x(), 0, 'f', 1)
+                          .arg(rect.y(), 0, 'f', 1)
+                          .arg(rect.width(), 0, 'f', 1)
+                          .arg(rect.height(), 0, 'f', 1)
+                          .toStdWString());
 }
 
 QImage renderScene(QGraphicsScene& scene, QSize size)

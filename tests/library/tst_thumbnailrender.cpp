@@ -149,14 +149,14 @@ void tst_ThumbnailRender::fastStageLogsWhereTheTextsAre()
     const QStringList lines = log.takeDebugLines();
     QCOMPARE(lines.size(), 2);
     static const QRegularExpression form(QRegularExpression::anchoredPattern(QStringLiteral(
-        "\\[ThumbnailRender\\] 200: text (\\d) boundingRect (-?\\d+),(-?\\d+) (\\d+)x(\\d+)")));
+        "\\[ThumbnailRender\\] 200: text (\\d) boundingRect (-?[\\d.]+),(-?[\\d.]+) ([\\d.]+)x([\\d.]+)")));
     const QRegularExpressionMatch first = form.match(lines.at(0));
     const QRegularExpressionMatch second = form.match(lines.at(1));
     QVERIFY2(first.hasMatch() && second.hasMatch(), qPrintable(lines.join('\n')));
     QCOMPARE(first.captured(1), QStringLiteral("1"));
     QCOMPARE(second.captured(1), QStringLiteral("3"));
-    QVERIFY(first.captured(4).toInt() > 0);
-    QVERIFY(second.captured(4).toInt() > first.captured(4).toInt());
+    QVERIFY(first.captured(4).toDouble() > 0);
+    QVERIFY(second.captured(4).toDouble() > first.captured(4).toDouble());
     QCOMPARE(second.captured(5), first.captured(5));
 
     archive->releaseVectorText();
