@@ -30,17 +30,6 @@ std::string fileNameOf(const std::string& path)
     return slash == std::string::npos ? path : path.substr(slash + 1);
 }
 
-// Whether this can be a picture beside its title. A preset's background lies elsewhere, and a title file of
-// foreign making must not choose what else is removed: an empty name stands for the folder itself, and others
-// for titles or for files of other folders.
-bool isPictureName(const std::string& name)
-{
-    return !name.empty() && name.find('/') == std::string::npos &&
-           QFileInfo(QString::fromStdString(name))
-                   .suffix()
-                   .compare(QLatin1String("xml"), Qt::CaseInsensitive) != 0;
-}
-
 template <typename T>
 std::vector<std::unique_ptr<T>> own(const std::vector<T*>& records)
 {
@@ -183,6 +172,15 @@ bool ArchiveManager::isTitleFile(const std::string& path)
     const QFileInfo file(QString::fromStdString(path));
     return file.suffix().compare(QLatin1String("xml"), Qt::CaseInsensitive) == 0 &&
            file.fileName().compare(QLatin1String(TitleParser::ORDER_FILEPATH), Qt::CaseInsensitive) != 0;
+}
+
+bool ArchiveManager::isPictureName(const std::string& name)
+{
+    // The system's calls would end a name at a NUL.
+    return !name.empty() && name.find('/') == std::string::npos && name.find('\0') == std::string::npos &&
+           QFileInfo(QString::fromStdString(name))
+                   .suffix()
+                   .compare(QLatin1String("xml"), Qt::CaseInsensitive) != 0;
 }
 
 std::vector<ArchiveOrder> ArchiveManager::orderRowsFor(const std::vector<std::string>& files)

@@ -47,6 +47,12 @@ public:
     // Whether a path is that of an XML file other than the order file, whatever the case of its letters.
     static bool isTitleFile(const std::string& path);
 
+    // Whether a name in a title file may be that of a picture beside it. A title file of foreign making must
+    // not choose what else is written over or removed, so names that lead to another folder and those of XML
+    // files are none, and the empty one is none either. A preset's background lies elsewhere and so is none.
+    // Any thread.
+    static bool isPictureName(const std::string& name);
+
 private:
     static ArchiveManager* mInstance;
     std::string mTitleRootFolderPath;

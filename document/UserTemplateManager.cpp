@@ -183,6 +183,11 @@ int UserTemplateManager::addNewTemplateToLastInOrderXml(std::string name)
     return 1;
 }
 
+int UserTemplateManager::removeFromOrderXml(std::string name)
+{
+    return std::erase(mFolderList, name) == 0 ? 0 : createNewOrderXml();
+}
+
 int UserTemplateManager::loadTemplate(std::string name, Archive* archive)
 {
     if (!archive)

@@ -40,6 +40,10 @@ public:
     // Puts a template at the end of the order, where it may already stand elsewhere in it; 1.
     int addNewTemplateToLastInOrderXml(std::string name);
 
+    // Takes a template out of the order, which stays as it is otherwise. 0, with nothing written, when none
+    // has the name.
+    int removeFromOrderXml(std::string name);
+
     // Reads a template and sets the record's name to that of the folder, also when it cannot be read (0).
     int loadTemplate(std::string name, Archive* archive);
 

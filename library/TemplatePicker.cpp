@@ -132,7 +132,7 @@ void TemplatePicker::createButtons()
     mCancelButton = createButton(this, QPoint(cancelLeft, BUTTONS_TOP), "cancelTemplateButton");
     connect(mSelectButton, &QPushButton::clicked, this, &TemplatePicker::selectClicked);
     connect(mSelectButton2, &QPushButton::clicked, this, &TemplatePicker::selectClicked2);
-    connect(mCancelButton, &QPushButton::clicked, this, &TemplatePicker::reject);
+    connect(mCancelButton, &QPushButton::clicked, this, &TemplatePicker::cancelClicked);
 }
 
 KSPushbutton* TemplatePicker::createButton(QWidget* parent, const QPoint& position, const char* name)

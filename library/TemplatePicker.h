@@ -92,12 +92,14 @@ signals:
 
 public slots:
     // What happened to template folders: saved by the list, or reported by the file manager. Names are those
-    // of folders; a full path of a folder serves as well.
+    // of folders. A path is that of a folder or of any file in it, and serves as the name of an import as
+    // well. A rename or delete of what is no template is logged and changes nothing.
     void slotSaveAsTemplate(QString name);
     void slotImportNewUserTemplate(QString name);
     void slotRenameUserTemplate(QString oldName, QString newName, QString path);
     void slotDeleteUserTemplate(QString path);
 
+    void cancelClicked();
     void selectClicked();
     void selectClicked2();
     void deleteClicked2();

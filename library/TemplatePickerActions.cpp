@@ -20,13 +20,26 @@ namespace
 const int NOT_FOUND_NUMBER = 400;
 const int WARNING_PRIORITY = 4;
 
-// Name of the folder that holds the file of this path; of a path without a file it is the last part.
-QString folderNameOf(const QString& path)
+// What stands behind the last "/", if it is not the end.
+QString lastPartOf(const QString& path)
 {
-    const QFileInfo info(path);
-    return info.fileName().endsWith(QLatin1String(".xml")) || path.endsWith(QLatin1Char('/'))
-               ? info.dir().dirName()
-               : info.fileName();
+    return QFileInfo(QDir::cleanPath(path)).fileName();
+}
+
+// The folder that holds the file of this path; a path that ends with "/" is that of the folder.
+QString folderOf(const QString& path)
+{
+    const QString clean = QDir::cleanPath(path);
+    return path.endsWith(QLatin1Char('/')) ? clean : QFileInfo(clean).path();
+}
+
+// The template that a path leads to. Others tell a file in its folder, whichever it is, or the folder, with a
+// "/" or not; what does not lead to a template goes by the name of the path's folder.
+QString templateNameIn(const TemplateTab& tab, const QString& path)
+{
+    const QString name = lastPartOf(folderOf(path));
+    const QString last = lastPartOf(path);
+    return tab.findTemplateIdFromName(name) == -1 && tab.findTemplateIdFromName(last) != -1 ? last : name;
 }
 
 void logNotFound(const std::wstring& text)
@@ -103,6 +116,12 @@ void TemplatePicker::updateTextObjectArea(const Archive& archive)
 {
     mPreviewArchive = archive;
     mPreview->updateRightChild();
+}
+
+void TemplatePicker::cancelClicked()
+{
+    LOG_USER_OPERATE(L"Template Area", 200, L"Tap Cancel Button");
+    reject();
 }
 
 void TemplatePicker::selectClicked()
@@ -183,13 +202,16 @@ void TemplatePicker::slotSaveAsTemplate(QString name)
 void TemplatePicker::slotImportNewUserTemplate(QString name)
 {
     if (name.contains(QLatin1Char('/')))
-        name = folderNameOf(name);
+        name = QFileInfo(name).isDir() ? lastPartOf(name) : templateNameIn(*mUserTab, name);
     const int id = findTemplateIdFromName(name);
     if (id != -1)
         overrideTemplate(id);
     auto archive = std::make_unique<Archive>();
-    if (mUserController.createNewTemplateXml(name.toStdString(), archive.get()) == 0)
-        return; // no such folder: there is nothing to offer
+    if (mUserController.createNewTemplateXml(name.toStdString(), archive.get()) == 0) {
+        // No such folder: there is nothing to offer, nor is what had the name before.
+        mUserController.removeFromOrderXml(name.toStdString());
+        return;
+    }
     mUserController.addNewTemplateToLastInOrderXml(name.toStdString());
     addNewTemplateToLast(archive.release());
 }
@@ -206,9 +228,7 @@ void TemplatePicker::slotRenameUserTemplate(QString oldName, QString newName, QS
         return;
     }
     Archive* archive = mUserTab->archive(id);
-    const QString folder = path.endsWith(QLatin1String(".xml")) || path.endsWith(QLatin1Char('/'))
-                               ? QFileInfo(path).path()
-                               : path;
+    const QString folder = lastPartOf(path) == newName ? QDir::cleanPath(path) : folderOf(path);
     archive->setName((newName + QStringLiteral("/Titler")).toStdString());
     archive->setPath((folder + QStringLiteral("/Titler.xml")).toStdString());
     TemplateItem* item = mUserTab->item(id);
@@ -222,7 +242,7 @@ void TemplatePicker::slotRenameUserTemplate(QString oldName, QString newName, QS
 
 void TemplatePicker::slotDeleteUserTemplate(QString path)
 {
-    const QString name = folderNameOf(path);
+    const QString name = templateNameIn(*mUserTab, path);
     const int id = findTemplateIdFromName(name);
     if (id == -1) {
         logNotFound(L"slotDeleteUserTemplate() \"" + name.toStdWString() + L"(" + path.toStdWString() +

@@ -6,12 +6,14 @@
 #include "document/Archive.h"
 #include "document/TText.h"
 #include "library/TitlerUtility.h"
+#include "support/LogManager.h"
 
 #include <QFile>
 #include <QGraphicsDropShadowEffect>
 #include <QPainter>
 #include <QPixmap>
 #include <QPoint>
+#include <string>
 
 const QSize ThumbnailRender::THUMBNAIL_BIG_SIZE(1920, 1080);
 const QSize ThumbnailRender::THUMBNAIL_MID_SIZE(1280, 720);
@@ -38,6 +40,20 @@ void limitTextsToRaster(const QGraphicsScene& scene)
         if (item->type() == GraphicsText::Type)
             static_cast<GraphicsText*>(item)->setBoundingRectFlag(true);
     }
+}
+
+void logBoundingRect(const GraphicsText& text, int id)
+{
+    // A damaged file may tell places that no integer holds.
+    const QRectF rect = text.sceneBoundingRect();
+    LOG_DEBUG_OPERATE(L"ThumbnailRender", 200,
+                      QStringLiteral("text %1 boundingRect %2,%3 %4x%5")
+                          .arg(id)
+                          .arg(rect.x(), 0, 'f', 1)
+                          .arg(rect.y(), 0, 'f', 1)
+                          .arg(rect.width(), 0, 'f', 1)
+                          .arg(rect.height(), 0, 'f', 1)
+                          .toStdWString());
 }
 
 QImage renderScene(QGraphicsScene& scene, QSize size)
@@ -115,6 +131,7 @@ void ThumbnailRender::createMiddleSizeCanvasSceneUsingArchiveData(const Archive&
             shadow->setColor(DROP_SHADOW_COLOR);
         mTexts.append(text);
         mMiddleScene.addItem(text);
+        logBoundingRect(*text, record->getTextObjectID());
     }
     limitTextsToRaster(mMiddleScene);
 }
@@ -186,9 +203,12 @@ void ThumbnailRender::drawNextBigPicture()
 
 void ThumbnailRender::deleteOldFile(const Archive& archive)
 {
-    QFile file(QString::fromStdString(
-        TitlerUtility::getThumbnailPathFromTitlePath(archive.getPath(), archive.getThumbnailBig())));
-    if (!archive.getThumbnailBig().empty() && file.exists() && !file.isOpen())
+    const std::string path =
+        TitlerUtility::getPicturePathFromTitlePath(archive.getPath(), archive.getThumbnailBig());
+    if (path.empty())
+        return;
+    QFile file(QString::fromStdString(path));
+    if (file.exists() && !file.isOpen())
         file.remove();
 }
 

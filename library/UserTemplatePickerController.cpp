@@ -34,6 +34,11 @@ int UserTemplatePickerController::addNewTemplateToLastInOrderXml(std::string nam
     return UserTemplateManager::getInstance()->addNewTemplateToLastInOrderXml(std::move(name));
 }
 
+int UserTemplatePickerController::removeFromOrderXml(std::string name)
+{
+    return UserTemplateManager::getInstance()->removeFromOrderXml(std::move(name));
+}
+
 int UserTemplatePickerController::createNewTemplateXml(std::string name, Archive* archive)
 {
     return UserTemplateManager::getInstance()->createNewTemplateXml(std::move(name), archive);

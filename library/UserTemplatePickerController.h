@@ -19,6 +19,7 @@ public:
     // See UserTemplateManager for these.
     int loadTemplate(std::string name, Archive* archive);
     int addNewTemplateToLastInOrderXml(std::string name);
+    int removeFromOrderXml(std::string name);
     int createNewTemplateXml(std::string name, Archive* archive);
     int renameInOrderXml(std::string oldName, std::string newName);
     int reCreateNewOrderXml();

@@ -173,6 +173,17 @@ private slots:
         QVERIFY(QFileInfo(file("sub")).isDir());
     }
 
+    void namesOfPictures()
+    {
+        for (const char* name :
+             {"t_1920.png", "t.jpg", "no extension", ".hidden.png", "xml", "a.xml.png", "片.png"})
+            QVERIFY2(ArchiveManager::isPictureName(name), name);
+        for (const char* name :
+             {"", "/", "a/b.png", "../b.png", "..//", "t.xml", "T.XmL", ".xml", ".order.xml"})
+            QVERIFY2(!ArchiveManager::isPictureName(name), name);
+        QVERIFY(!ArchiveManager::isPictureName(std::string("t.xml\0.png", 10)));
+    }
+
     void theFolderOutlivesItsLastTitle()
     {
         Archive archive; // names no pictures

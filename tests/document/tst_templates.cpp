@@ -256,6 +256,21 @@ private slots:
         QCOMPARE(rows().size(), 4);
     }
 
+    void takingOneOutOfTheOrder()
+    {
+        for (int i = 1; i <= 3; ++i)
+            makeUserTemplate(QStringLiteral("t%1").arg(i), i);
+        UserTemplateManager* const manager = UserTemplateManager::getInstance();
+        QCOMPARE(manager->addNewTemplateToLastInOrderXml("t1"), 1); // by the files' times it is the first
+        const QByteArray before = read(userFile(".order.xml"));
+        for (const char* name : {"unknown", "", "t2/Titler.xml"})
+            QCOMPARE(manager->removeFromOrderXml(name), 0);
+        QCOMPARE(read(userFile(".order.xml")), before);
+        QCOMPARE(manager->removeFromOrderXml("t2"), 1);
+        QCOMPARE(rows(), QStringList({"t3/Titler.xml", "t1/Titler.xml"}));
+        QCOMPARE(manager->removeFromOrderXml("t2"), 0);
+    }
+
     void loadingATemplate()
     {
         makeUserTemplate("a", 100);

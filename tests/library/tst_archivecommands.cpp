@@ -8,11 +8,33 @@
 #include "library/DeleteArchiveCommand.h"
 #include "library/FocusArchiveCommand.h"
 #include "library/MoveArchiveCommand.h"
+#include "touchui/ITitlerAPPEventFilterController.h"
 
 #include <QLabel>
 #include <QSignalSpy>
 #include <QTest>
 #include <QUndoStack>
+
+namespace
+{
+
+// The way of the locks to the other processes.
+class AppEventRecorder : public ITitlerAPPEventFilterController
+{
+public:
+    AppEventRecorder() { setInstance(this); }
+
+    void initialize(TitlerToolFactory*) override {}
+    void sendAPPEvent(APPEventDefine::LOCKTYPE type, bool on) override { mSent.append({int(type), on}); }
+    void informRestoreOriginal(APPEventDefine::EventRevicer) override {}
+
+    QList<QPair<int, bool>> take() { return std::exchange(mSent, {}); }
+
+private:
+    QList<QPair<int, bool>> mSent;
+};
+
+} // namespace
 
 class tst_ArchiveCommands : public QObject
 {
@@ -36,7 +58,9 @@ private slots:
     void createWithoutAFolderDoesNothing();
     void createFromABlankTemplate();
     void moveAndBack();
+    void undoOfAMoveEndsTheOperation();
     void runOfTapsIsOneStep();
+    void focusStepsAreRemembered();
     void focusOfTheSameItemChangesNothing();
     void commandsOutliveTheirItems();
     void createCommandIsEmpty();
@@ -333,6 +357,31 @@ void tst_ArchiveCommands::moveAndBack()
     QCOMPARE(mFolders.take(), (Names{QStringLiteral("order move"), QStringLiteral("order move")}));
 }
 
+void tst_ArchiveCommands::undoOfAMoveEndsTheOperation()
+{
+    AppEventRecorder events;
+    open(QStringLiteral("move border"));
+    ArchiveItem* moved = item(1);
+    mList->removeWidgetItem(moved);
+    mList->addWidgetItem(moved, 2);
+    mList->selectOperationArchive(2);
+    mStack->push(new MoveArchiveCommand(mList.get(), moved, 1, 2));
+    QCOMPARE(moved->styleSheet(), ArchiveItem::OPERATE_AND_UN_SELECT_STATE);
+    QVERIFY(events.take().isEmpty());
+    mStack->undo();
+    QCOMPARE(moved->styleSheet(), ArchiveItem::UN_OPERATE_AND_UN_SELECT_STATE);
+    QCOMPARE(events.take(), (QList<QPair<int, bool>>{{2, false}}));
+    mStack->redo();
+    QVERIFY(events.take().isEmpty());
+
+    // The border of the chosen title stays that of the chosen one.
+    mList->selectOperationArchive(0);
+    QCOMPARE(item(0)->styleSheet(), ArchiveItem::OPERATE_AND_SELECT_STATE);
+    mStack->undo();
+    QCOMPARE(item(0)->styleSheet(), ArchiveItem::UN_OPERATE_AND_SELECT_STATE);
+    QCOMPARE(events.take(), (QList<QPair<int, bool>>{{2, false}}));
+}
+
 void tst_ArchiveCommands::runOfTapsIsOneStep()
 {
     open(QStringLiteral("focus"),
@@ -349,6 +398,17 @@ void tst_ArchiveCommands::runOfTapsIsOneStep()
     mStack->redo();
     QCOMPARE(mCanvas.back(), QStringLiteral("c"));
     QCOMPARE(selected(), 3);
+}
+
+void tst_ArchiveCommands::focusStepsAreRemembered()
+{
+    const QString folder = open(QStringLiteral("focus path"));
+    tap(2);
+    QCOMPARE(ArchiveController().getLastArchivePath(), folder + QStringLiteral("/c.xml"));
+    mStack->undo();
+    QCOMPARE(ArchiveController().getLastArchivePath(), folder + QStringLiteral("/a.xml"));
+    mStack->redo();
+    QCOMPARE(ArchiveController().getLastArchivePath(), folder + QStringLiteral("/c.xml"));
 }
 
 void tst_ArchiveCommands::focusOfTheSameItemChangesNothing()

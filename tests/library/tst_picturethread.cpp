@@ -41,6 +41,8 @@ private slots:
     void jobsAreWrittenInOrder();
     void unwritableFolderIsPassedOver();
     void namesThatLeaveTheFolderAreNotWritten();
+    void namesOfTitlesAreNoPictures_data();
+    void namesOfTitlesAreNoPictures();
     void deletedTitleKeepsNoPictures_data();
     void deletedTitleKeepsNoPictures();
 
@@ -176,6 +178,38 @@ void tst_PictureThread::namesThatLeaveTheFolderAreNotWritten()
     QVERIFY(!QFile::exists(mFixture.titleRoot() + QStringLiteral("/stray.png")));
     QCOMPARE(QDir(folder).entryList(QDir::Files | QDir::Hidden, QDir::Name),
              (QStringList{QStringLiteral("t_240.png"), QStringLiteral("t_960.png")}));
+}
+
+void tst_PictureThread::namesOfTitlesAreNoPictures_data()
+{
+    QTest::addColumn<bool>("isDeletedMeanwhile");
+    QTest::newRow("written") << false;
+    QTest::newRow("removed with the title") << true;
+}
+
+void tst_PictureThread::namesOfTitlesAreNoPictures()
+{
+    QFETCH(bool, isDeletedMeanwhile);
+    HoldingReporter reporter;
+    const QString folder = mFixture.makeFolder(QStringLiteral("titles"));
+    LibraryFixture::fillFolder(folder, {QStringLiteral("t"), QStringLiteral("other")});
+    const auto archive = LibraryFixture::makeRecord(folder, QStringLiteral("t"), QString());
+    archive->setThumbnailBig("other.xml");
+    archive->setThumbnailMiddle(".order.xml");
+    archive->setThumbnailBlack("other.XML");
+    PictureThread thread;
+    thread.addArchive(archive.get(), pictures(Qt::red));
+    QVERIFY(reporter.reached.tryAcquire(1, 20000));
+    if (isDeletedMeanwhile)
+        QVERIFY(QFile::remove(folder + QStringLiteral("/t.xml")));
+    reporter.goOn.release();
+    QTRY_VERIFY_WITH_TIMEOUT(thread.isThreadWaiting(), 20000);
+    QVERIFY(!QFile::exists(folder + QStringLiteral("/other.XML")));
+    QCOMPARE(LibraryFixture::order(folder), (QStringList{QStringLiteral("t"), QStringLiteral("other")}));
+    Archive other;
+    QVERIFY(ArchiveController().getOneArchive(folder + QStringLiteral("/other.xml"), &other));
+    QCOMPARE(other.text().size(), std::size_t(1));
+    QCOMPARE(QFile::exists(folder + QStringLiteral("/t_240.png")), !isDeletedMeanwhile);
 }
 
 void tst_PictureThread::deletedTitleKeepsNoPictures_data()

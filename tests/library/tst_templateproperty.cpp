@@ -43,6 +43,7 @@ private:
     void save();
     void importNew();
     void importOverOne();
+    void importOfOneThatWent();
     void renameOutside();
     void deleteOutside();
     void deleteByQuestion();
@@ -56,10 +57,11 @@ private:
     QString randomName() { return mNames.at(random(int(mNames.size()))); }
     int random(int bound) { return int(mRandom.bounded(quint32(bound))); }
     QString folderOf(const QString& name) const { return mFixture.userRoot() + '/' + name; }
-    // As it is told by others: the folder, with a slash or not, or the title in it.
+    // As it is told by others: the folder, with a slash or not, or a file in it.
     QString pathOf(const QString& name)
     {
-        return random(2) == 0 ? folderOf(name) + '/' : mFixture.userTitle(name);
+        static const char* const ends[] = {"", "/", "/Titler.xml", "/Titler_240.png", "/Titler"};
+        return folderOf(name) + QLatin1String(ends[random(5)]);
     }
     // Files get ages of their own: the order at a start is that of their times.
     void makeYoungest(const QString& name);
@@ -112,12 +114,16 @@ void tst_TemplateProperty::step()
     const int more = qMax(1, COMFORTABLE_COUNT - int(mNames.size()));
     const int fewer = mNames.isEmpty() ? 0 : qMax(1, int(mNames.size()) - COMFORTABLE_COUNT);
     const int some = mNames.isEmpty() ? 0 : 3;
-    const QList<QPair<int, Action>> actions{
-        {more, &tst_TemplateProperty::save},           {more, &tst_TemplateProperty::importNew},
-        {some, &tst_TemplateProperty::importOverOne},  {some, &tst_TemplateProperty::renameOutside},
-        {fewer, &tst_TemplateProperty::deleteOutside}, {2 * fewer, &tst_TemplateProperty::deleteByQuestion},
-        {3 * some, &tst_TemplateProperty::choose},     {1, &tst_TemplateProperty::noticesOfNothing},
-        {1, &tst_TemplateProperty::readAgain}};
+    const QList<QPair<int, Action>> actions{{more, &tst_TemplateProperty::save},
+                                            {more, &tst_TemplateProperty::importNew},
+                                            {some, &tst_TemplateProperty::importOverOne},
+                                            {some, &tst_TemplateProperty::renameOutside},
+                                            {fewer, &tst_TemplateProperty::importOfOneThatWent},
+                                            {fewer, &tst_TemplateProperty::deleteOutside},
+                                            {2 * fewer, &tst_TemplateProperty::deleteByQuestion},
+                                            {3 * some, &tst_TemplateProperty::choose},
+                                            {1, &tst_TemplateProperty::noticesOfNothing},
+                                            {1, &tst_TemplateProperty::readAgain}};
     int sum = 0;
     for (const auto& [weight, action] : actions)
         sum += weight;
@@ -180,7 +186,7 @@ void tst_TemplateProperty::importNew()
     const QString name = newName();
     mDoing = "import " + name;
     mFixture.makeUserPictures(name);
-    mPicker->slotImportNewUserTemplate(random(2) == 0 ? name : folderOf(name));
+    mPicker->slotImportNewUserTemplate(random(2) == 0 ? name : pathOf(name));
     makeYoungest(name);
     mNames.append(name);
 }
@@ -189,12 +195,21 @@ void tst_TemplateProperty::importOverOne()
 {
     const QString name = randomName();
     mDoing = "import over " + name;
-    mPicker->slotImportNewUserTemplate(random(2) == 0 ? name : folderOf(name) + '/');
+    mPicker->slotImportNewUserTemplate(random(2) == 0 ? name : pathOf(name));
     makeYoungest(name);
     mNames.removeAll(name);
     mNames.append(name);
     if (mChosen == name)
         mChosen.clear(); // it is another template now
+}
+
+void tst_TemplateProperty::importOfOneThatWent()
+{
+    const QString name = randomName();
+    mDoing = "import of the missing " + name;
+    QVERIFY(QDir(folderOf(name)).removeRecursively());
+    mPicker->slotImportNewUserTemplate(random(2) == 0 ? name : pathOf(name));
+    forget(name);
 }
 
 void tst_TemplateProperty::renameOutside()

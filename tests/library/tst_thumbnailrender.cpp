@@ -1,9 +1,12 @@
 // The pictures of a title: sizes, places, transparency and when each stage runs.
 #include "LibraryFixture.h"
+#include "LogFixture.h"
 
+#include "document/TShadow.h"
 #include "library/ThumbnailRender.h"
 
 #include <QElapsedTimer>
+#include <QRegularExpression>
 #include <QSignalSpy>
 #include <QTest>
 #include <QThread>
@@ -35,10 +38,14 @@ private slots:
     void fastStageTouchesNoDisk();
     void fastStageWithoutBackgroundIsTransparent();
     void fastStageScalesTheBackground();
+    void fastStageLogsWhereTheTextsAre();
+    void shadowOfTheFastStage();
     void missingBackgroundIsPassedOver();
     void hugeBackgroundGivesPicturesOfTheUsualSize();
     void slowStageWritesFourFiles();
     void slowStageRemovesTheOldBigPicture();
+    void slowStageRemovesNothingElse_data();
+    void slowStageRemovesNothingElse();
     void slowStageDrawsWhileTheEventsGoOn();
     void waitingWithoutEventsDrawsWhatIsLeft();
     void textsStandAtOneAndAHalfTimesTheirPlace();
@@ -129,6 +136,70 @@ void tst_ThumbnailRender::fastStageScalesTheBackground()
     QCOMPARE(moved.pixelColor(180, 60), QColor(Qt::blue));
 }
 
+void tst_ThumbnailRender::fastStageLogsWhereTheTextsAre()
+{
+    const auto archive = LibraryFixture::makeRecord(mFixture.makeFolder(QStringLiteral("logged")),
+                                                    QStringLiteral("t"), QString());
+    archive->setText({LibraryFixture::makeText(QStringLiteral("one"), 1),
+                      LibraryFixture::makeText(QStringLiteral("longer"), 3)});
+    ThumbnailRender render;
+    LogFixture log;
+    log.takeDebugLines();
+    fastPicture(render, *archive);
+    const QStringList lines = log.takeDebugLines();
+    QCOMPARE(lines.size(), 2);
+    static const QRegularExpression form(QRegularExpression::anchoredPattern(QStringLiteral(
+        "\\[ThumbnailRender\\] 200: text (\\d) boundingRect (-?[\\d.]+),(-?[\\d.]+) ([\\d.]+)x([\\d.]+)")));
+    const QRegularExpressionMatch first = form.match(lines.at(0));
+    const QRegularExpressionMatch second = form.match(lines.at(1));
+    QVERIFY2(first.hasMatch() && second.hasMatch(), qPrintable(lines.join('\n')));
+    QCOMPARE(first.captured(1), QStringLiteral("1"));
+    QCOMPARE(second.captured(1), QStringLiteral("3"));
+    QVERIFY(first.captured(4).toDouble() > 0);
+    QVERIFY(second.captured(4).toDouble() > first.captured(4).toDouble());
+    QCOMPARE(second.captured(5), first.captured(5));
+
+    archive->releaseVectorText();
+    fastPicture(render, *archive);
+    QVERIFY(log.takeDebugLines().isEmpty());
+}
+
+// Black and, other than that of the canvas and the large pictures, opaque.
+void tst_ThumbnailRender::shadowOfTheFastStage()
+{
+    const auto archive = LibraryFixture::makeRecord(mFixture.makeFolder(QStringLiteral("shadow")),
+                                                    QStringLiteral("t"), QString());
+    TText* text = LibraryFixture::makeText(QStringLiteral("█████\n█████\n█████"), 1, 0, 0);
+    for (TextStyle* style : text->getTextItems()) {
+        style->setFontSize(200);
+        style->setTextKerning(24);
+        style->setFontColor("#ffffff");
+    }
+    text->getTextShadow()->setShadowDirectionX(1);
+    text->getTextShadow()->setShadowDirectionY(1);
+    archive->setText({text});
+
+    // The highest alpha of what is black: in the narrow gaps, which have shadow from all sides.
+    const auto opacity = [](const QImage& image) {
+        int highest = 0;
+        for (int y = 0; y < image.height(); ++y) {
+            for (int x = 0; x < image.width(); ++x) {
+                const QColor colour = image.pixelColor(x, y);
+                if (colour.value() == 0)
+                    highest = qMax(highest, colour.alpha());
+            }
+        }
+        return highest;
+    };
+    QCOMPARE(ThumbnailRender::DROP_SHADOW_COLOR, QColor(0, 0, 0, 255));
+    ThumbnailRender render;
+    const int fast = opacity(fastPicture(render, *archive));
+    const int large = opacity(slowPicture(*archive, "_1920.png"));
+    QVERIFY2(large > 100 && large <= 190, qPrintable(QString::number(large)));
+    // Softer in the small picture, where a shadow of the same colour would be the lighter one.
+    QVERIFY2(fast > large + 20, qPrintable(QStringLiteral("%1 and %2").arg(fast).arg(large)));
+}
+
 void tst_ThumbnailRender::missingBackgroundIsPassedOver()
 {
     const QString folder = mFixture.makeFolder(QStringLiteral("missing"));
@@ -191,6 +262,42 @@ void tst_ThumbnailRender::slowStageRemovesTheOldBigPicture()
     const auto archive = LibraryFixture::makeRecord(folder, QStringLiteral("t"), QString());
     paint(folder + QStringLiteral("/t_1920.png"), QSize(10, 10), Qt::red);
     QCOMPARE(slowPicture(*archive, "_1920.png").size(), QSize(1920, 1080));
+}
+
+void tst_ThumbnailRender::slowStageRemovesNothingElse_data()
+{
+    QTest::addColumn<QString>("name");
+    QTest::newRow("of another folder") << "../neighbour/x.png";
+    QTest::newRow("absolute") << mFixture.titleRoot() + "/neighbour/x.png";
+    QTest::newRow("another title") << "other.xml";
+    QTest::newRow("another title in capitals") << "OTHER.XML";
+    QTest::newRow("the title itself") << "t.xml";
+    QTest::newRow("the order") << ".order.xml";
+}
+
+void tst_ThumbnailRender::slowStageRemovesNothingElse()
+{
+    QFETCH(QString, name);
+    const QString neighbour = mFixture.makeFolder(QStringLiteral("neighbour"));
+    paint(neighbour + QStringLiteral("/x.png"), QSize(10, 10), Qt::red);
+    const QString folder = mFixture.makeFolder(QStringLiteral("foreign"));
+    LibraryFixture::fillFolder(folder, {QStringLiteral("t"), QStringLiteral("other")});
+    QVERIFY(QFile::copy(folder + QStringLiteral("/other.xml"), folder + QStringLiteral("/OTHER.XML")));
+    const auto archive = LibraryFixture::makeRecord(folder, QStringLiteral("t"), QStringLiteral("Foreign"));
+    archive->setThumbnailBig(name.toStdString());
+    const QString named = QDir(folder).absoluteFilePath(name);
+    QFile file(named);
+    QVERIFY(file.open(QIODevice::ReadOnly));
+    const QByteArray before = file.readAll();
+    file.close();
+
+    ThumbnailRender render;
+    render.makeThumbnail(archive.get(), true);
+    QVERIFY(QFile::exists(named));
+    QTRY_VERIFY_WITH_TIMEOUT(render.makePictureThreadIsFinished(), 20000);
+    QVERIFY(file.open(QIODevice::ReadOnly));
+    QCOMPARE(file.readAll(), before);
+    QVERIFY(QFile::exists(folder + QStringLiteral("/t_960.png")));
 }
 
 // Nobody asks whether it has finished.

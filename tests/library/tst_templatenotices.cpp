@@ -1,0 +1,262 @@
+// What the template picker makes of the file manager's notices about template folders, told in each way a
+// path can be told, and what it writes to the logs.
+#include "LogFixture.h"
+#include "TemplateFixture.h"
+
+#include "library/TemplateItem.h"
+#include "library/TemplatePicker.h"
+#include "library/TemplateTab.h"
+#include "touchui/KSPushbutton.h"
+
+#include <QTest>
+#include <cstdarg>
+#include <cstdio>
+
+namespace
+{
+
+QStringList systemLog;
+
+} // namespace
+
+// In the place of the platform library's: what goes to the system log stays here.
+extern "C" void k2sys_syslog(int priority, const char* format, ...)
+{
+    char line[1024];
+    va_list args;
+    va_start(args, format);
+    std::vsnprintf(line, sizeof(line), format, args);
+    va_end(args);
+    systemLog.append(QString::number(priority) + QLatin1Char(' ') + QString::fromUtf8(line));
+}
+
+class tst_TemplateNotices : public QObject
+{
+    Q_OBJECT
+
+private slots:
+    void initTestCase() { Q_INIT_RESOURCE(TitlerToolResource); }
+    void init();
+    void cleanup() { mPicker.reset(); }
+    void deletePaths_data();
+    void deletePaths();
+    void theFolderOfThePathGoesFirst();
+    void unknownDelete_data();
+    void unknownDelete();
+    void renamePaths_data();
+    void renamePaths();
+    void unknownRename();
+    void importPaths_data();
+    void importPaths();
+    void importOfAFolderThatIsNotThere_data();
+    void importOfAFolderThatIsNotThere();
+    void taps();
+
+private:
+    TemplateTab* users() const { return mPicker->userTab(); }
+    QStringList names() const
+    {
+        QStringList result;
+        for (int id = 0; id < users()->count(); ++id)
+            result.append(TemplateTab::templateName(*users()->archive(id)));
+        return result;
+    }
+    // "%1" stands for the root of the templates.
+    QString told(QString path) const { return path.replace(QLatin1String("%1"), mFixture.userRoot()); }
+
+    TemplateFixture mFixture;
+    TitleReportRecorder mReports;
+    MessageRecorder mMessages;
+    LogFixture mLog;
+    std::unique_ptr<TemplatePicker> mPicker;
+};
+
+void tst_TemplateNotices::init()
+{
+    mFixture.resetTemplates();
+    mFixture.makeUserTemplates(3);
+    mPicker = std::make_unique<TemplatePicker>();
+    systemLog.clear();
+    mLog.takeOperations();
+    mLog.takeDebugLines();
+}
+
+void tst_TemplateNotices::deletePaths_data()
+{
+    QTest::addColumn<QString>("path");
+    QTest::newRow("title") << "%1/UserTemplate_002/Titler.xml";
+    QTest::newRow("picture") << "%1/UserTemplate_002/Titler_240.png";
+    QTest::newRow("file without an extension") << "%1/UserTemplate_002/Titler";
+    QTest::newRow("file with the name of a template") << "%1/UserTemplate_002/UserTemplate_003";
+    QTest::newRow("folder with a slash") << "%1/UserTemplate_002/";
+    QTest::newRow("folder") << "%1/UserTemplate_002";
+    QTest::newRow("folder with two slashes") << "%1/UserTemplate_002//";
+    QTest::newRow("in the root") << "UserTemplate_002/Titler.xml";
+    QTest::newRow("name") << "UserTemplate_002";
+}
+
+void tst_TemplateNotices::deletePaths()
+{
+    QFETCH(QString, path);
+    QVERIFY(QDir(mFixture.userRoot() + "/UserTemplate_002").removeRecursively());
+    mPicker->slotDeleteUserTemplate(told(path));
+    QCOMPARE(names(), QStringList({"UserTemplate_001", "UserTemplate_003"}));
+    QCOMPARE(mFixture.userOrder(), names());
+    QVERIFY(systemLog.isEmpty());
+}
+
+void tst_TemplateNotices::theFolderOfThePathGoesFirst()
+{
+    mFixture.makeUserTemplate("a.xml");
+    mPicker->slotSaveAsTemplate("a.xml");
+    QVERIFY(QDir(mFixture.userRoot() + "/a.xml").removeRecursively());
+    mPicker->slotDeleteUserTemplate(mFixture.userRoot() + "/a.xml");
+    QCOMPARE(names(), QStringList({"UserTemplate_001", "UserTemplate_002", "UserTemplate_003"}));
+    QCOMPARE(mFixture.userOrder(), names());
+}
+
+void tst_TemplateNotices::unknownDelete_data()
+{
+    QTest::addColumn<QString>("path");
+    QTest::addColumn<QString>("name");
+    QTest::newRow("folder with a slash") << "%1/nobody/"
+                                         << "nobody";
+    QTest::newRow("title") << "%1/片头/Titler.xml"
+                           << "片头";
+    QTest::newRow("folder") << "%1/nobody"
+                            << "usertemplates";
+    QTest::newRow("root") << "/"
+                          << "";
+}
+
+void tst_TemplateNotices::unknownDelete()
+{
+    QFETCH(QString, path);
+    QFETCH(QString, name);
+    const QStringList before = names();
+    mPicker->slotDeleteUserTemplate(told(path));
+    QCOMPARE(systemLog,
+             QStringList(QStringLiteral("4 TemplatePicker 400: slotDeleteUserTemplate() \"") + name +
+                         QLatin1Char('(') + told(path) + QStringLiteral(")\" is not found.")));
+    QCOMPARE(names(), before);
+    QCOMPARE(mFixture.userOrder(), before);
+}
+
+void tst_TemplateNotices::renamePaths_data()
+{
+    QTest::addColumn<QString>("name");
+    QTest::addColumn<QString>("path");
+    QTest::newRow("title") << "after"
+                           << "%1/after/Titler.xml";
+    QTest::newRow("picture") << "after"
+                             << "%1/after/Titler_240.png";
+    QTest::newRow("file without an extension") << "after"
+                                               << "%1/after/Titler";
+    QTest::newRow("folder with a slash") << "after"
+                                         << "%1/after/";
+    QTest::newRow("folder") << "after"
+                            << "%1/after";
+    QTest::newRow("folder called like a file") << "片头.xml"
+                                               << "%1/片头.xml";
+    QTest::newRow("in a folder called like a file") << "a.png"
+                                                    << "%1/a.png/Titler_240.png";
+}
+
+void tst_TemplateNotices::renamePaths()
+{
+    QFETCH(QString, name);
+    QFETCH(QString, path);
+    users()->item(1)->clickTriggered();
+    QVERIFY(QDir(mFixture.userRoot()).rename("UserTemplate_002", name));
+    mPicker->slotRenameUserTemplate("UserTemplate_002", name, told(path));
+    QCOMPARE(names(), QStringList({"UserTemplate_001", name, "UserTemplate_003"}));
+    QCOMPARE(QString::fromStdString(users()->archive(1)->getPath()), mFixture.userTitle(name));
+    QCOMPARE(mFixture.userOrder(), names());
+    QCOMPARE(QString::fromStdString(UserTemplatePickerController().getLastSelectedTemplate()),
+             mFixture.userTitle(name));
+    QCOMPARE(
+        mLog.takeDebugLines(),
+        QStringList(QStringLiteral("[TemplatePicker] 200: slotRenameUserTemplate() UserTemplate_002 -> ") +
+                    name));
+    QVERIFY(systemLog.isEmpty());
+}
+
+void tst_TemplateNotices::unknownRename()
+{
+    const QStringList before = names();
+    mPicker->slotRenameUserTemplate("nobody", "片头", told("%1/片头/"));
+    QCOMPARE(systemLog, QStringList("4 TemplatePicker 400: slotRenameUserTemplate() \"nobody\" is not found. "
+                                    "cannot rename to \"片头\"."));
+    QCOMPARE(mLog.takeDebugLines(),
+             QStringList("[TemplatePicker] 200: slotRenameUserTemplate() nobody -> 片头"));
+    QCOMPARE(names(), before);
+    QCOMPARE(mFixture.userOrder(), before);
+}
+
+void tst_TemplateNotices::importPaths_data()
+{
+    QTest::addColumn<QString>("path");
+    QTest::newRow("name") << "new one";
+    QTest::newRow("folder") << "%1/new one";
+    QTest::newRow("folder with a slash") << "%1/new one/";
+    QTest::newRow("title") << "%1/new one/Titler.xml";
+    QTest::newRow("picture") << "%1/new one/Titler_240.png";
+}
+
+void tst_TemplateNotices::importPaths()
+{
+    QFETCH(QString, path);
+    mFixture.makeUserPictures("new one");
+    mPicker->slotImportNewUserTemplate(told(path));
+    QCOMPARE(names(), QStringList({"UserTemplate_001", "UserTemplate_002", "UserTemplate_003", "new one"}));
+    QCOMPARE(mFixture.userOrder(), names());
+}
+
+void tst_TemplateNotices::importOfAFolderThatIsNotThere_data()
+{
+    QTest::addColumn<QString>("path");
+    QTest::newRow("name") << "UserTemplate_002";
+    QTest::newRow("folder") << "%1/UserTemplate_002";
+    QTest::newRow("folder with a slash") << "%1/UserTemplate_002/";
+}
+
+void tst_TemplateNotices::importOfAFolderThatIsNotThere()
+{
+    QFETCH(QString, path);
+    // The files' times tell another order than the tiles.
+    mFixture.makeUserTemplate("UserTemplate_001");
+    QVERIFY(QDir(mFixture.userRoot() + "/UserTemplate_002").removeRecursively());
+    users()->item(1)->clickTriggered();
+    mPicker->slotImportNewUserTemplate(told(path));
+    QCOMPARE(names(), QStringList({"UserTemplate_001", "UserTemplate_003"}));
+    QCOMPARE(mFixture.userOrder(), names());
+    QVERIFY(!users()->selectedItem());
+    // And a reading of what is on disk tells no other.
+    mPicker->reloadTemplates2();
+    QCOMPARE(names(), QStringList({"UserTemplate_001", "UserTemplate_003"}));
+}
+
+void tst_TemplateNotices::taps()
+{
+    mFixture.makePresets("templates_en", {"a", "b"});
+    mPicker = std::make_unique<TemplatePicker>();
+    mPicker->show();
+    QVERIFY(QTest::qWaitForWindowExposed(mPicker.get()));
+    mLog.takeOperations();
+    mPicker->presetTab()->item(1)->clickTriggered();
+    mPicker->showUserTemplateTab();
+    users()->item(2)->clickTriggered();
+    QCOMPARE(mLog.takeOperations(), QStringList({"[Template Area] 200: Select the 1 thumnail",
+                                                 "[Template Area] 200: Select the 2 thumnail"}));
+    QTest::mouseClick(mPicker->findChild<KSPushbutton*>("cancelTemplateButton"), Qt::LeftButton);
+    QVERIFY(!mPicker->isVisible());
+    QCOMPARE(mPicker->result(), int(QDialog::Rejected));
+    QCOMPARE(mLog.takeOperations(), QStringList("[Template Area] 200: Tap Cancel Button"));
+    // Closed otherwise, nobody tapped.
+    mPicker->show();
+    mPicker->reject();
+    QVERIFY(mLog.takeOperations().isEmpty());
+}
+
+QTEST_MAIN(tst_TemplateNotices)
+#include "tst_templatenotices.moc"
