@@ -7,6 +7,7 @@
 #include "document/DocumentConstants.h"
 #include "document/LastSettingParser.h"
 #include "document/TitleParserUtility.h"
+#include "support/FolderLookup.h"
 #include "support/HiddenName.h"
 #include "support/IPathManagerEx.h"
 #include "support/Utf8.h"
@@ -29,11 +30,7 @@ const std::string TITLE_STEM = "Titler";
 // Empty when the folder is not told or cannot be made.
 std::string userTemplatesRoot()
 {
-    try {
-        return TitleParserUtility::wstring2String(IPathManagerEx::getInstance()->getTitlerTemplatesPath());
-    } catch (const fs::filesystem_error&) {
-        return {};
-    }
+    return FolderLookup::multiByte(&IPathManagerEx::getTitlerTemplatesPath);
 }
 
 bool exists(const std::string& path)

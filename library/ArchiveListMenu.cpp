@@ -10,6 +10,7 @@
 #include "library/ListMessages.h"
 #include "library/PasteArchiveCommand.h"
 #include "library/TitleReports.h"
+#include "support/FolderLookup.h"
 #include "support/IPathManagerEx.h"
 #include "support/LogManager.h"
 #include "support/SystemInfo.h"
@@ -271,7 +272,7 @@ void ArchiveList::exeAddUserArchive()
 {
     if (!mOperationItem || !mOperationItem->getArchiveData())
         return;
-    const QString root = QString::fromStdWString(IPathManagerEx::getInstance()->getTitlerTemplatesPath());
+    const QString root = QString::fromStdWString(FolderLookup::wide(&IPathManagerEx::getTitlerTemplatesPath));
     const QString name = mController->getFreeNameInUserTemplate(root);
     const auto templates = static_cast<int>(mController->getFileOrder(root).size());
     // Without a free name, which can be so from 998 rows on, the template would become a file among the

@@ -1,6 +1,7 @@
 #include "library/FolderPickerController.h"
 
 #include "library/FolderNameRules.h"
+#include "support/FolderLookup.h"
 #include "support/IPathManagerEx.h"
 #include "support/SystemInfo.h"
 
@@ -14,7 +15,7 @@ bool FolderPickerController::isNullDirectory(const QFileInfo& folder) const
 
 QString FolderPickerController::getTitlerRootFolder() const
 {
-    const QString path = QString::fromStdWString(IPathManagerEx::getInstance()->getTitleResourcesPath());
+    const QString path = QString::fromStdWString(FolderLookup::wide(&IPathManagerEx::getTitleResourcesPath));
     return path.isEmpty() ? path : QDir::cleanPath(path);
 }
 

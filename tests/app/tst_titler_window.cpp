@@ -19,6 +19,7 @@
 #include "document/TitleParser.h"
 #include "library/ArchiveItem.h"
 #include "library/ArchiveList.h"
+#include "messaging/services/MessageCenterParams.h"
 #include "touchui/KSInputContext.h"
 #include "touchui/KSPushbutton.h"
 
@@ -32,6 +33,15 @@
 #include <QTemporaryDir>
 #include <QTest>
 #include <QWindow>
+
+namespace
+{
+
+constexpr long MESSAGE_CENTER = 65;
+constexpr long SET_TOP_WINDOW = 1;
+constexpr long POST_MESSAGE = 3;
+
+} // namespace
 
 class tst_titler_window : public QObject
 {
@@ -363,13 +373,27 @@ void tst_titler_window::masksOnlyWhileVisible()
 
 void tst_titler_window::missingFontIsReportedOnShow()
 {
+    const auto messages = [this] {
+        QList<int> ids;
+        for (QByteArray arguments : mSiblings.argumentsOf(MESSAGE_CENTER, POST_MESSAGE)) {
+            MessageDefine::_tagMessageParam message;
+            MessageCenterParams::deserialize_postMessage_param(message, arguments.data(),
+                                                               long(arguments.size()));
+            ids.append(message.messageId);
+        }
+        return ids;
+    };
+    mSiblings.forget();
     mWindow->setHasMessageToShowInformation(true, "No Such Family");
     request(writeFolder("fonts", {"t1"}));
+    QTRY_COMPARE(messages(), QList<int>{MessageDef::MESSAGE_FONT_MISSING});
     // The message left once; a second show has nothing to tell.
-    QVERIFY(mWindow->isVisible());
     mWindow->closeTitlerWindow();
     request(writeFolder("fonts", {"t1"}));
     QVERIFY(mWindow->isVisible());
+    mWindow->closeTitlerWindow();
+    QTRY_COMPARE(mSiblings.countOf(MESSAGE_CENTER, SET_TOP_WINDOW), 4);
+    QCOMPARE(messages(), QList<int>{MessageDef::MESSAGE_FONT_MISSING});
 }
 
 void tst_titler_window::windowManagerCloseKeepsTheProcess()

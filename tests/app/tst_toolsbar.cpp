@@ -64,6 +64,7 @@ private Q_SLOTS:
     void mouseBesideTheMenuOnlyCloses();
     void menuMarksTheItemUnderTheFinger();
     void disablingLetsGoOfTheTouch();
+    void disabledButtonLeavesTheTouchAlone();
     void textsAreTranslated();
 
 private:
@@ -430,6 +431,17 @@ void TestToolsBar::menuMarksTheItemUnderTheFinger()
     QCoreApplication::sendEvent(menu(), &leave);
     QCOMPARE(menu()->grab().toImage(), plain);
     m_bar->hideCanvasMenu();
+}
+
+// It is disabled again with every step that leaves nothing to redo, whoever is touched meanwhile.
+void TestToolsBar::disabledButtonLeavesTheTouchAlone()
+{
+    m_bar->changeBtnStatus(false);
+    QTest::touchEvent(button("Folder"), m_device).press(0, QPoint(60, 20));
+    m_bar->changeBtnStatus(false);
+    QVERIFY(APPEventFilter::instance()->isLock(nullptr, LOCKMETHOD_TOUCH));
+    QTest::touchEvent(button("Folder"), m_device).release(0, QPoint(60, 20));
+    QVERIFY(!APPEventFilter::instance()->isLock(nullptr, LOCKMETHOD_TOUCH));
 }
 
 void TestToolsBar::disablingLetsGoOfTheTouch()

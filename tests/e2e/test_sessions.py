@@ -1,4 +1,5 @@
 """What a session does besides editing one title: the question on closing, requests that do not count, the sub panel."""
+import os
 import unittest
 
 import harness
@@ -48,6 +49,12 @@ class Requests(harness.TitlerTest):
         self.command("dialog-mask 0")
         harness.session.wait_until(lambda: self.display.grab() == before, 20 * harness.SLOW, "the first title again")
         self.assert_canvas_shows(first, mean=1.0, visible=0.01)
+
+    def test_the_folder_of_the_titles_is_printed_once(self):
+        self.open_title(self.titles(self.folder())[0])
+        with open(os.path.join(self.keep, "titler.log"), encoding="utf-8") as stream:
+            printed = [line.strip() for line in stream if line.startswith("mTitleRootFolderPath")]
+        self.assertEqual(printed, ["mTitleRootFolderPath = " + os.path.dirname(self.folder())])
 
     def test_a_path_that_does_not_exist_shows_nothing(self):
         self.command(f'edit "{self.folder("gone")}/gone.xml"')

@@ -2,7 +2,7 @@
 // reports and the texts of its messages.
 #include "TitleListFixture.h"
 
-#include "support/LogManager.h"
+#include "tests/support/LogFixture.h"
 #include "touchui/ITitlerAPPEventFilterController.h"
 
 #include <QSignalSpy>
@@ -96,22 +96,10 @@ private:
     }
     QString templateRoot() const { return QDir::cleanPath(mFixture.titleRoot() + "/../usertemplates"); }
     // "[area] number: text" of what the operator did to the titles since the last call.
-    Names newLogLines()
-    {
-        QFile file(mLogs.filePath(QStringLiteral("k2_ope.log")));
-        if (!file.open(QIODevice::ReadOnly) || !file.seek(mLogPosition))
-            return {};
-        const Names lines = QString::fromUtf8(file.readAll()).split(QLatin1Char('\n'), Qt::SkipEmptyParts);
-        mLogPosition = file.pos();
-        Names texts;
-        for (const QString& line : lines)
-            texts.append(line.mid(line.indexOf(QLatin1String("]: [")) + 3));
-        return texts.filter(QStringLiteral("[Thumbnail]"));
-    }
+    Names newLogLines() { return mLog.takeOperations().filter(QStringLiteral("[Thumbnail]")); }
 
     LibraryFixture mFixture;
-    QTemporaryDir mLogs;
-    qint64 mLogPosition = 0;
+    LogFixture mLog;
     MessageRecorder mMessages;
     QPointingDevice* mDevice = nullptr;
     std::unique_ptr<EventRecorder> mEvents;
@@ -120,15 +108,12 @@ private:
 
 void tst_ArchiveMenu::initTestCase()
 {
-    qputenv("K2SYS_LOG_DIR", mLogs.path().toLocal8Bit());
-    INIT_LOGGING(L"KS2Titler");
     mDevice = QTest::createTouchDevice();
     mDevice->setParent(this);
 }
 
 void tst_ArchiveMenu::cleanupTestCase()
 {
-    UNINIT_LOGGING();
 }
 
 void tst_ArchiveMenu::init()

@@ -2,7 +2,7 @@
 // header sorts. Which check comes first when a folder is opened in the editor. What the operator, the other
 // processes and the operation log are told.
 #include "FolderPickerFixture.h"
-#include "tests/touchui/OperationLog.h"
+#include "tests/support/LogFixture.h"
 
 #include <QHeaderView>
 #include <QLabel>
@@ -47,7 +47,7 @@ class TestFolderTaps : public QObject
     Q_OBJECT
 
 public:
-    explicit TestFolderTaps(OperationLog& log) : mLog(log) {}
+    explicit TestFolderTaps(LogFixture& log) : mLog(log) {}
 
 private slots:
     void initTestCase()
@@ -164,10 +164,10 @@ private slots:
         f.make("news");
         f.open();
         f.tap("news");
-        mLog.takeDebug(QString());
+        mLog.takeDebugLines(QString());
         f.tapButton("openFolderButton");
         const QString id = QString::number(f.window->winId());
-        QCOMPARE(mLog.takeDebug("KSInputContext"), QStringList("200: App Name:Titler***WID:" + id));
+        QCOMPARE(mLog.takeDebugLines("KSInputContext"), QStringList("200: App Name:Titler***WID:" + id));
     }
 
     // --- Names ----------------------------------------------------------------------------------------
@@ -272,7 +272,7 @@ private slots:
     {
         for (const char* name : {"b", "c", "a"})
             f.make(QLatin1String(name));
-        mLog.take(QString());
+        mLog.takeOperations(QString());
         f.open();
         QCOMPARE(fileList(), QStringList());
         tapHeader(FolderPickerFactory::NameColumn);
@@ -296,7 +296,7 @@ private slots:
         f.make("a");
         f.make("b");
         f.open();
-        mLog.take(QString());
+        mLog.takeOperations(QString());
         f.hold("a");
         f.type("c");
         tapHeader(FolderPickerFactory::NameColumn);
@@ -311,7 +311,7 @@ private slots:
         f.make("a");
         f.make("b");
         f.open();
-        mLog.take(QString());
+        mLog.takeOperations(QString());
         const QWidget* header = f.tree()->header()->viewport();
         const QPoint name = header->mapTo(f.picker.get(), sectionCenter(FolderPickerFactory::NameColumn));
         const QPoint date = header->mapTo(f.picker.get(), sectionCenter(FolderPickerFactory::DateColumn));
@@ -337,7 +337,7 @@ private slots:
     void everyTapIsLogged()
     {
         f.make("news", {"t1"});
-        mLog.take(QString());
+        mLog.takeOperations(QString());
         f.open();
         QCOMPARE(folderArea(), QStringList());
         f.tap("news");
@@ -374,18 +374,18 @@ private:
                 header->height() / 2};
     }
     void tapHeader(int column) { f.tap(f.tree()->header()->viewport(), sectionCenter(column)); }
-    QStringList fileList() { return mLog.take(QStringLiteral("File List")); }
-    QStringList folderArea() { return mLog.take(QStringLiteral("Folder Area")); }
+    QStringList fileList() { return mLog.takeOperations(QStringLiteral("File List")); }
+    QStringList folderArea() { return mLog.takeOperations(QStringLiteral("Folder Area")); }
     QLabel* thumbnail() const { return f.picker->findChild<QLabel*>("folderThumbnail"); }
     QLabel* sizeLabel() const { return f.picker->findChild<QLabel*>("folderFileSize"); }
 
-    OperationLog& mLog;
+    LogFixture& mLog;
     FolderPickerFixture f;
 };
 
 int main(int argc, char** argv)
 {
-    OperationLog log;
+    LogFixture log;
     KSInputContext::install();
     QApplication app(argc, argv);
     app.setObjectName(QStringLiteral("Titler"));

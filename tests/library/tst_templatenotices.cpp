@@ -1,6 +1,6 @@
 // What the template picker makes of the file manager's notices about template folders, told in each way a
 // path can be told, and what it writes to the logs.
-#include "LogFixture.h"
+#include "../support/LogFixture.h"
 #include "TemplateFixture.h"
 
 #include "library/TemplateItem.h"

@@ -1,6 +1,6 @@
 // The pictures of a title: sizes, places, transparency and when each stage runs.
+#include "../support/LogFixture.h"
 #include "LibraryFixture.h"
-#include "LogFixture.h"
 
 #include "document/TShadow.h"
 #include "library/ThumbnailRender.h"

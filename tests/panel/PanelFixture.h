@@ -6,7 +6,7 @@
 #include "document/TText.h"
 #include "panel/TextToolsPanel.h"
 #include "support/IPathManagerEx.h"
-#include "support/LogManager.h"
+#include "tests/support/LogFixture.h"
 
 #include <QDir>
 #include <QFile>
@@ -48,14 +48,12 @@ public:
         Q_INIT_RESOURCE(TitlerToolResource);
         Q_INIT_RESOURCE(UILibrary);
         qputenv("K2SYS_AC_DATA", folder.path().toLocal8Bit());
-        qputenv("K2SYS_LOG_DIR", folder.path().toLocal8Bit());
         QDir(folder.path()).mkpath(QStringLiteral("defaultuser"));
         QFile paths(folder.filePath(QStringLiteral("defaultuser/PathInfo.xml")));
         if (paths.open(QIODevice::WriteOnly))
             paths.write("<?xml version=\"1.0\"?><PathInfo><SystemSetting path=\"settings\"/><Font "
                         "path=\"fonts\"/></PathInfo>");
         paths.close();
-        INIT_LOGGING(L"KS2Titler");
         device.reset(QTest::createTouchDevice());
         postedMessages = &messages;
         MessageBoxController::setProvider([]() -> MessageBoxController* { return postedMessages; }, [] {});
@@ -64,26 +62,11 @@ public:
     {
         MessageBoxController::setProvider(nullptr, nullptr);
         postedMessages = nullptr;
-        UNINIT_LOGGING();
         IPathManagerEx::clearUp();
     }
 
     // "[area] number: text" of every line of the operation log since the last call.
-    QStringList newLogLines()
-    {
-        QFile file(folder.filePath(QStringLiteral("k2_ope.log")));
-        if (!file.open(QIODevice::ReadOnly) || !file.seek(logPosition))
-            return {};
-        const QStringList lines =
-            QString::fromUtf8(file.readAll()).split(QLatin1Char('\n'), Qt::SkipEmptyParts);
-        logPosition = file.pos();
-        QStringList texts;
-        for (const QString& line : lines) {
-            const qsizetype begin = line.indexOf(QLatin1String("]: ["));
-            texts << line.mid(begin + 3);
-        }
-        return texts;
-    }
+    QStringList newLogLines() { return log.takeOperations(); }
 
     // The screen of the tests is smaller than the appliance's, so the window comes to the finger.
     void bringOnScreen(QWidget* widget, QPoint point)
@@ -103,7 +86,7 @@ public:
     QTemporaryDir folder;
     PostedMessages messages;
     std::unique_ptr<QPointingDevice> device;
-    qint64 logPosition = 0;
+    LogFixture log;
 };
 
 // A record with one plain character for each letter.

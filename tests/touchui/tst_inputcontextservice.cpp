@@ -1,7 +1,7 @@
 // What the soft keyboard service sends to fields.
 #include "support/LogManager.h"
+#include "tests/support/LogFixture.h"
 #include "tests/touchui/InputContextFixture.h"
-#include "tests/touchui/OperationLog.h"
 
 using namespace SubCommonDefine;
 
@@ -10,7 +10,7 @@ class TestInputContextService : public InputContextFixture
     Q_OBJECT
 
 public:
-    explicit TestInputContextService(OperationLog& log) : m_log(log) {}
+    explicit TestInputContextService(LogFixture& log) : m_log(log) {}
 
 private Q_SLOTS:
     void stringsIntoALineEdit();
@@ -41,9 +41,9 @@ private:
         INIT_LOGGING(L"KS2Titler");
         typed();
     }
-    QStringList typed() { return m_log.take(QStringLiteral("Text Input")); }
+    QStringList typed() { return m_log.takeOperations(QStringLiteral("Text Input")); }
 
-    OperationLog& m_log;
+    LogFixture& m_log;
 };
 
 void TestInputContextService::stringsIntoALineEdit()
@@ -454,7 +454,7 @@ void TestInputContextService::whatIsNoTypedTextIsNotLogged()
 
 int main(int argc, char** argv)
 {
-    OperationLog log;
+    LogFixture log;
     KSInputContext::install();
     QApplication app(argc, argv);
     TestInputContextService test(log);

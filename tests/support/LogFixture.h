@@ -1,0 +1,57 @@
+// Log files of the test's own, and what is written to them.
+#pragma once
+
+#include "support/LogManager.h"
+
+#include <QFile>
+#include <QString>
+#include <QStringList>
+#include <QTemporaryDir>
+
+// One at a time.
+class LogFixture
+{
+public:
+    LogFixture()
+    {
+        qputenv("K2SYS_LOG_DIR", mDir.path().toLocal8Bit());
+        INIT_LOGGING(L"test");
+    }
+    ~LogFixture() { UNINIT_LOGGING(); }
+
+    // "number: text" of the area's lines since the last call, of whatever area that was, in the operation log
+    // and in the debug log; of all areas, as "[area] number: text", when none is named.
+    QStringList takeOperations(const QString& area = {})
+    {
+        return take(QStringLiteral("k2_ope.log"), mOperationsEnd, area);
+    }
+    QStringList takeDebugLines(const QString& area = {})
+    {
+        return take(QStringLiteral("k2_ope_debug.log"), mDebugEnd, area);
+    }
+
+private:
+    QStringList take(const QString& name, qint64& end, const QString& area) const
+    {
+        QFile file(mDir.filePath(name));
+        if (!file.open(QIODevice::ReadOnly) || !file.seek(end))
+            return {QStringLiteral("no ") + name};
+        const QStringList lines =
+            QString::fromUtf8(file.readAll()).split(QLatin1Char('\n'), Qt::SkipEmptyParts);
+        end = file.pos();
+        const QString before = QStringLiteral("]: ");
+        const QString mark =
+            area.isEmpty() ? before : before + QLatin1Char('[') + area + QStringLiteral("] ");
+        QStringList result;
+        for (const QString& line : lines) {
+            const qsizetype begin = line.indexOf(mark);
+            if (begin >= 0)
+                result.append(line.mid(begin + mark.size()));
+        }
+        return result;
+    }
+
+    QTemporaryDir mDir;
+    qint64 mOperationsEnd = 0;
+    qint64 mDebugEnd = 0;
+};
