@@ -529,6 +529,10 @@ void CanvasScene::mousePressEvent(QGraphicsSceneMouseEvent* event)
 
 void CanvasScene::mouseReleaseEvent(QGraphicsSceneMouseEvent* event)
 {
+    if (event->button() != Qt::LeftButton) {
+        QGraphicsScene::mouseReleaseEvent(event); // it may have grabbed an object by a double click
+        return;
+    }
     const bool pressed = m_currentPressedObjectId != -1;
     m_texts->releaseAllBut(m_currentPressedObjectId);
     if (pressed) {

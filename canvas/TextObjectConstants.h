@@ -16,9 +16,9 @@ struct TextObjectConstants {
     inline static const QString ITEMBOUNDINGDOTDOWNCOLOR = QStringLiteral("black");
     static constexpr int ITEMBOUNDINGWIDTH = 4;
 
-    // Limits of the canvas and of the full raster.
-    static constexpr QRectF SCENE_RECT{0.0, 0.0, 1279.0, 719.0};
-    static constexpr QRectF BIG_SCENE_RECT{0.0, 0.0, 1919.0, 1079.0};
+    // Limits of the canvas and of the full raster: pixels 0 to 1279 and 0 to 719, and so on.
+    static constexpr QRectF SCENE_RECT{0.0, 0.0, 1280.0, 720.0};
+    static constexpr QRectF BIG_SCENE_RECT{0.0, 0.0, 1920.0, 1080.0};
     // Stored sizes are pixels of the 1920 raster; the canvas shows them at two thirds.
     static constexpr double SCENEPERCENTAGE = 0.6666666666666666;
     static constexpr double CENTERPERCNTAGE = 0.5;

@@ -61,6 +61,7 @@ void TextPainter::addGlyph(int position, const QString& text, const CaretGeometr
     glyph.path = GlyphPathCache::glyph(font, text);
     glyph.baseline = QPointF(caret.x - CaretShift, caret.top + BaselineShare * caret.height);
     glyph.color = CharacterFormat::color(style->getFontColor());
+    glyph.color.setAlpha(255);
     glyph.edge = style->isTextEdge() != 0 && glyph.path->hasPath();
     if (glyph.edge) {
         glyph.edgeColor = CharacterFormat::color(style->textEdge().getEdgeColor());

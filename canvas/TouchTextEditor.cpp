@@ -380,19 +380,22 @@ void TouchTextEditor::getPressedPos(QPointF point)
         return;
     const QTextDocument& document = *m_item.document();
     CaretGeometry& carets = m_item.textPainter().carets();
+    const auto reaches = [&](const QTextBlock& block) {
+        return carets.heightAbove(block.blockNumber()) + block.layout()->boundingRect().height() >= point.y();
+    };
     QTextBlock tapped = document.begin();
-    for (QTextBlock block = document.begin(); block.isValid(); block = block.next()) {
-        if (carets.heightAbove(block.blockNumber()) + block.layout()->boundingRect().height() >= point.y()) {
-            tapped = block;
-            break;
-        }
-    }
-    if (tapped.layout()->lineCount() == 0)
+    while (!reaches(tapped) && tapped.next().isValid())
+        tapped = tapped.next();
+    // Below the text the caret goes to the last line, in the column of the first.
+    const bool below = !reaches(tapped);
+    const QTextBlock measured = below ? document.begin() : tapped;
+    if (measured.layout()->lineCount() == 0)
         return;
-    const double inside = point.y() - carets.heightAbove(tapped.blockNumber());
-    QTextLine line = tapped.layout()->lineAt(0);
-    for (int i = 1; i < tapped.layout()->lineCount() && line.y() + line.height() < inside; ++i)
-        line = tapped.layout()->lineAt(i);
+    const double inside = point.y() - carets.heightAbove(measured.blockNumber());
+    QTextLine line = measured.layout()->lineAt(0);
+    for (int i = 1; !below && i < measured.layout()->lineCount() && line.y() + line.height() < inside; ++i)
+        line = measured.layout()->lineAt(i);
+    // What lies left of the line is taken off by the line itself.
     putCursor(tapped.position() + line.xToCursor(point.x() - document.documentMargin() - CaretShift));
 }
 

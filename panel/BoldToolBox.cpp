@@ -23,8 +23,8 @@ BoldToolBox::BoldToolBox(QWidget* parent) : ToolBox(parent)
 
 void BoldToolBox::boldBtnClicked()
 {
-    setFontBold(m_bold == 1 ? 0 : 1);
     Q_EMIT signalClearSizeBoxLineEditFocus(true);
+    setFontBold(m_bold == 1 ? 0 : 1);
     Q_EMIT boldChange(m_bold, TextObjectConstants::PropertyBold);
 }
 

@@ -103,7 +103,7 @@ void EdgeSizeSlider::drawToolTip()
 
 void EdgeSizeSlider::slotSliderMouseRelease()
 {
-    LOG_USER_OPERATE(L"Text Property Area", 200, L"Adjust Edge Width to " + std::to_wstring(value()));
+    LOG_USER_OPERATE(L"Text Property Area", 200, L"Adjust Edge Width to ");
 }
 
 void EdgeSizeSlider::paintEvent(QPaintEvent*)

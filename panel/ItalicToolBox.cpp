@@ -14,8 +14,8 @@ ItalicToolBox::ItalicToolBox(QWidget* parent) : ToolBox(parent)
 
 void ItalicToolBox::italicBtnClicked()
 {
-    setFontItalic(m_italic == 1 ? 0 : 1);
     Q_EMIT signalClearSizeBoxLineEditFocus(true);
+    setFontItalic(m_italic == 1 ? 0 : 1);
     Q_EMIT italicChange(m_italic, TextObjectConstants::PropertyItalic);
 }
 

@@ -9,6 +9,7 @@
 #include "touchui/KSPushbutton.h"
 
 #include <QCoreApplication>
+#include <QGuiApplication>
 #include <QHBoxLayout>
 #include <QKeyEvent>
 #include <QLabel>
@@ -217,9 +218,14 @@ bool SizeToolBox::eventFilter(QObject* object, QEvent* event)
         enterPressed();
         return true;
     }
-    case QEvent::FocusOut:
-        editingLeft();
+    case QEvent::FocusOut: {
+        // A window of another process, such as the keyboard itself, does not end the field.
+        const bool leftProcess = static_cast<QFocusEvent*>(event)->reason() == Qt::ActiveWindowFocusReason &&
+                                 QGuiApplication::focusWindow() == nullptr;
+        if (!leftProcess)
+            editingLeft();
         return false;
+    }
     case KSInputContext::SoftKeyBoardCloseType:
         editingLeft();
         return true;
@@ -313,7 +319,9 @@ void SizeToolBox::editingLeft()
     if (!m_editMark)
         return;
     m_editMark = false;
-    if (m_edit->hasAcceptableInput()) {
+    // What was typed on the keyboard is only in the verdict about it; the question about the field overwrites
+    // that.
+    if (m_valid && m_edit->hasAcceptableInput()) {
         showText(m_lastValidText);
     } else {
         resetLastValidTextAndShowWarning();

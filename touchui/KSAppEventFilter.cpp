@@ -128,9 +128,13 @@ bool KSAppEventFilter::notifyRegEventFilter(QObject* obj, QEvent* event)
         return false;
     }
     // By index: a filter may leave, or be deleted, while it is asked.
-    for (qsizetype i = 0; i < m_eventFilters.size(); ++i) {
-        if (m_eventFilters.at(i)->eventFilter(obj, event)) {
+    for (qsizetype i = 0; i < m_eventFilters.size();) {
+        QObject* const asked = m_eventFilters.at(i);
+        if (asked->eventFilter(obj, event)) {
             return true;
+        }
+        if (m_eventFilters.value(i) == asked) {
+            ++i;
         }
     }
     return false;
@@ -247,7 +251,7 @@ int KSAppEventFilter::doLockTouchEnd(QObject* obj, QEvent* event)
     if (isLock(obj, method)) {
         result = tryUnlock(obj, method);
     }
-    logTouch(QStringLiteral("Name = %1 :TouchEnd %2; rs = %3 :PointCount = %4")
+    logTouch(QStringLiteral("Name = %1 :TouchEnd%2; rs = %3 :PointCount = %4")
                  .arg(objectName(), describe(obj))
                  .arg(result)
                  .arg(pointCount(event)));

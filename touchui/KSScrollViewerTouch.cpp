@@ -444,8 +444,9 @@ void KSScrollViewerWidget::onTranslateTouchEndEventToMouse(QObject*, QTouchEvent
 {
     m_press.popup.stop();
     m_press.object.clear();
-    // A list that runs on has been moved, even when its first tick is still to come.
-    if (isAutoFilck() && m_bar->maximum() > m_bar->minimum())
+    // A list that runs on has been moved, even when its first tick is still to come; a finger that slid a
+    // little is a tap all the same.
+    if ((m_press.willFlick || isMove()) && isAutoFilck() && m_bar->maximum() > m_bar->minimum())
         m_press.moved = true;
     endPress(pos);
 }

@@ -53,6 +53,16 @@ bool TouchEventButton::event(QEvent* event)
     }
 }
 
+// The end of a touch never comes to a button that was disabled under it, and must not be waited for.
+void TouchEventButton::changeEvent(QEvent* event)
+{
+    QPushButton::changeEvent(event);
+    if (event->type() == QEvent::EnabledChange && !isEnabled()) {
+        m_touching = false;
+        m_touchId = -1;
+    }
+}
+
 bool TouchEventButton::touchBeginEvent(QTouchEvent* event)
 {
     if (event->points().isEmpty()) {

@@ -149,6 +149,10 @@ void tst_taptable::tapBesideTheText()
     canvas.scene->clearItemsSelectionAndFocus();
     canvas.edit(1, canvas.inView(*item, QPointF(area.right() - 4.0, area.bottom() - 30.0)));
     QCOMPARE(item->textCursor().position(), 9);
+    // Below the last line, where the handles hang: the last line, in the column of the first.
+    canvas.scene->clearItemsSelectionAndFocus();
+    canvas.edit(1, canvas.inView(*item, QPointF(area.right() - 4.0, area.bottom() - 10.0)));
+    QCOMPARE(item->textCursor().position(), 5);
 }
 
 void tst_taptable::tapOnAnotherObject()
@@ -289,11 +293,11 @@ void tst_taptable::dragAgainstALimit()
     if (direction.x() < 0)
         expected.setX(-(size.width() - 100.0));
     else if (direction.x() > 0)
-        expected.setX(1279.0 - 100.0);
+        expected.setX(1280.0 - 100.0);
     else if (direction.y() < 0)
         expected.setY(-(size.height() - 100.0));
     else
-        expected.setY(719.0 - 100.0);
+        expected.setY(720.0 - 100.0);
     QCOMPARE(item->scenePos(), expected);
     QCOMPARE(item->parentTextItem()->pos(), expected);
     QCOMPARE(item->pos(), QPointF());
@@ -532,10 +536,10 @@ void tst_taptable::rangeTable_data()
     QTest::newRow("far down") << QPointF(10.0, 5000.0) << 4;
     QTest::newRow("left and up") << QPointF(-5000.0, -5000.0) << 3;
     QTest::newRow("right and down") << QPointF(5000.0, 5000.0) << 4;
-    QTest::newRow("right edge") << QPointF(1179.0, 10.0) << 0;
-    QTest::newRow("beyond the right edge") << QPointF(1179.5, 10.0) << 2;
-    QTest::newRow("lower edge") << QPointF(10.0, 619.0) << 0;
-    QTest::newRow("beyond the lower edge") << QPointF(10.0, 619.5) << 4;
+    QTest::newRow("right edge") << QPointF(1180.0, 10.0) << 0;
+    QTest::newRow("beyond the right edge") << QPointF(1180.5, 10.0) << 2;
+    QTest::newRow("lower edge") << QPointF(10.0, 620.0) << 0;
+    QTest::newRow("beyond the lower edge") << QPointF(10.0, 620.5) << 4;
 }
 
 void tst_taptable::rangeTable()

@@ -82,10 +82,10 @@ void tst_textpainting::boundingRectIsCropped()
     item.setBoundingRectFlag(true);
     item.setPos(200.0, 0.0);
     QCOMPARE(item.boundingRect().left(), 0.0);
-    QCOMPARE(item.boundingRect().right(), 1279.0 + 100.0 - 200.0);
+    QCOMPARE(item.boundingRect().right(), 1280.0 + 100.0 - 200.0);
     item.setPos(-500.0, 0.0);
     QCOMPARE(item.boundingRect().left(), 400.0);
-    QCOMPARE(item.boundingRect().right(), 1279.0 + 100.0 + 500.0);
+    QCOMPARE(item.boundingRect().right(), 1280.0 + 100.0 + 500.0);
     item.setPos(0.0, -150.0);
     QCOMPARE(item.boundingRect().top(), 50.0);
     item.setBoundingRectFlag(false);

@@ -150,6 +150,25 @@ void tst_touchediting::rightButtonDoesNothing()
     QCOMPARE(canvas.text(1)->getFocusFlag(), -1);
     canvas.tap(canvas.pointOn(1));
     QCOMPARE(canvas.text(1)->getFocusFlag(), 1);
+    // Nor does it end what is going on.
+    QSignalSpy selected(canvas.scene.get(), &CanvasScene::signalSceneNotifyIfExistSelectedObject);
+    for (const QPoint place : {canvas.pointOn(1), EmptyPlace}) {
+        QTest::mouseClick(canvas.view.viewport(), Qt::RightButton, {}, place);
+        QTest::mouseClick(canvas.view.viewport(), Qt::MiddleButton, {}, place);
+        QCOMPARE(canvas.text(1)->getFocusFlag(), 1);
+    }
+    canvas.tap(canvas.pointOn(1));
+    QCOMPARE(canvas.text(1)->textInteractionFlags(), Qt::TextEditorInteraction);
+    selected.clear();
+    for (const QPoint place : {canvas.pointOn(1), EmptyPlace}) {
+        QTest::mouseClick(canvas.view.viewport(), Qt::RightButton, {}, place);
+        QTest::mouseDClick(canvas.view.viewport(), Qt::RightButton, {}, place);
+        QCOMPARE(canvas.text(1)->textInteractionFlags(), Qt::TextEditorInteraction);
+    }
+    QVERIFY(selected.isEmpty());
+    // And the next left press is nobody's but that of what lies there.
+    canvas.tap(EmptyPlace);
+    QCOMPARE(canvas.text(1)->textInteractionFlags(), Qt::NoTextInteraction);
 }
 
 void tst_touchediting::releaseOnEmptyCanvas()

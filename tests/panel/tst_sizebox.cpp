@@ -12,6 +12,8 @@
 #include <QClipboard>
 #include <QGuiApplication>
 #include <QScrollBar>
+#include <QWindow>
+#include <qpa/qwindowsysteminterface.h>
 
 using Sizes = QList<int>;
 Q_DECLARE_METATYPE(Sizes)
@@ -46,6 +48,8 @@ private Q_SLOTS:
     void halfTypedSizeIsDroppedByAnotherBox();
     void halfTypedSizeWhenTheFieldIsLeft();
     void keyboardClosedWhileTyping();
+    void keyboardClosedAfterARefusedSize();
+    void keyboardWindowTakesTheFocus();
     void newSelectionEndsTyping();
     void describesItselfToTheKeyboard();
     void paintsByState();
@@ -414,6 +418,36 @@ void TestSizeBox::keyboardClosedWhileTyping()
     QCoreApplication::sendEvent(combo(), &closed);
     QVERIFY(!m_box->isEditing());
     QCOMPARE(text(), QStringLiteral("64"));
+    QVERIFY(m_environment->messages.posted.isEmpty());
+}
+
+// What is typed on the keyboard reaches the field with Enter only; until then there is the verdict about it.
+void TestSizeBox::keyboardClosedAfterARefusedSize()
+{
+    m_box->setFontSize({64});
+    tapField();
+    m_box->setValid(false);
+    QEvent closed(static_cast<QEvent::Type>(KSInputContext::SoftKeyBoardCloseType));
+    QCoreApplication::sendEvent(combo(), &closed);
+    QVERIFY(!m_box->isEditing());
+    QCOMPARE(text(), QStringLiteral("64"));
+    QCOMPARE(m_environment->messages.posted, QList<int>{111});
+}
+
+// The keyboard is a window of another process, which takes the activation when it is touched.
+void TestSizeBox::keyboardWindowTakesTheFocus()
+{
+    m_box->setFontSize({64});
+    tapField();
+    QVERIFY(m_box->isEditing());
+    QWindow* const window = m_window->windowHandle();
+    QWindowSystemInterface::handleWindowActivated<QWindowSystemInterface::SynchronousDelivery>(nullptr);
+    QCOMPARE(QGuiApplication::focusWindow(), nullptr);
+    QVERIFY(m_box->isEditing());
+    QWindowSystemInterface::handleWindowActivated<QWindowSystemInterface::SynchronousDelivery>(window);
+    QVERIFY(m_box->isEditing());
+    enter(QStringLiteral("72"));
+    QCOMPARE(text(), QStringLiteral("72"));
     QVERIFY(m_environment->messages.posted.isEmpty());
 }
 

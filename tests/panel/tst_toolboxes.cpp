@@ -295,6 +295,8 @@ void TestToolBoxes::edgeSliderDragIsOneStep()
     QTest::touchEvent(slider, m_environment->device.get())
         .release(0, QPoint(slider->width() + 40, handle.y()), slider);
     QCOMPARE(slider->value(), 10);
+    QCOMPARE(m_environment->newLogLines(),
+             QStringList{QStringLiteral("[Text Property Area] 200: Adjust Edge Width to ")});
     QVERIFY(!spy.isEmpty());
     for (const QVariantList& preview : std::as_const(spy)) {
         QCOMPARE(preview.at(0).toInt(), 1);

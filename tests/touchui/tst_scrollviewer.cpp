@@ -29,6 +29,7 @@ private Q_SLOTS:
     void flickGlidesAndRests();
     void flickDiesAtTheEnd();
     void quickFlickTapsNothing();
+    void quickShortSlideIsATap();
     void brakeTapsNothing();
     void boundedDragDoesNotRunOn();
     void leavingTheRowEndsThePress();
@@ -289,6 +290,17 @@ void TestScrollViewer::quickFlickTapsNothing()
     QCOMPARE(m->takeLog(), (Names{"pressed 2", "colour 2"}));
     m->clock.advance(330);
     QVERIFY(m->value() > 10);
+}
+
+// However quick: a finger never lies quite still.
+void TestScrollViewer::quickShortSlideIsATap()
+{
+    m->fill(40);
+    m->press(100, 250);
+    m->move(100, 248);
+    m->move(100, 238);
+    m->release(100, 238);
+    QCOMPARE(m->takeLog(), (Names{"pressed 2", "released 2", "clicked 2"}));
 }
 
 void TestScrollViewer::brakeTapsNothing()

@@ -77,6 +77,7 @@ private Q_SLOTS:
     void releasedPointInAnUpdateReleases();
     void touchRectangleKeepsTheFingerInside();
     void disabledButtonTakesTheTouchAndDoesNothing();
+    void disabledUnderTheFingerItWorksAgain();
     void cancelClicksNothing();
     void mouseStillWorks();
     void slicesByState();
@@ -208,6 +209,20 @@ void TestTouchButtons::disabledButtonTakesTheTouchAndDoesNothing()
     QTest::touchEvent(m_button, m_device).release(0, QPoint(10, 10));
     QCOMPARE(pressed.count(), 0);
     QCOMPARE(point.count(), 0);
+}
+
+void TestTouchButtons::disabledUnderTheFingerItWorksAgain()
+{
+    QSignalSpy clicked(m_button, &QAbstractButton::clicked);
+    QTest::touchEvent(m_button, m_device).press(0, QPoint(10, 10));
+    m_button->setEnabled(false);
+    QTest::touchEvent(m_button, m_device).release(0, QPoint(10, 10));
+    m_button->setEnabled(true);
+    QVERIFY(!m_button->isDown());
+    QTest::touchEvent(m_button, m_device).press(0, QPoint(10, 10));
+    QVERIFY(m_button->isDown());
+    QTest::touchEvent(m_button, m_device).release(0, QPoint(10, 10));
+    QCOMPARE(clicked.count(), 1);
 }
 
 void TestTouchButtons::cancelClicksNothing()
