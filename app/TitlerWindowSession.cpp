@@ -132,6 +132,7 @@ void TitlerWindow::closeTitlerMainWindow()
     } else {
         mTemplatePicker->reject(); // an answered message may come while it is open
         mFolderPicker->setCurrentFolderName(QString());
+        mToolsBar->hideCanvasMenu(); // a window of its own
         hide();
         mCanvasScene->clearCanvas();
         mArchiveList->cleanArchiveList();

@@ -267,7 +267,13 @@ void ToolsBar::setToolEnabled(const ToolButton& tool, bool enabled)
         tool.button->setEnabled(true);
         tool.button->changeButtonState(KSPushbutton::ButtonRest);
     } else {
-        setPushButtonDisabled(tool.button);
+        // What others hold is theirs: a step that is pushed by a timer disables Redo under whatever is
+        // touched.
+        if (tool.button->isDown() || tool.button == m_text.button) {
+            setPushButtonDisabled(tool.button);
+        } else {
+            tool.button->setEnabled(false);
+        }
         tool.button->changeButtonState(KSPushbutton::ButtonDisabled);
     }
 }
@@ -275,9 +281,6 @@ void ToolsBar::setToolEnabled(const ToolButton& tool, bool enabled)
 // A button that disables itself under the finger never sees the end of the touch, which it still holds.
 void ToolsBar::setPushButtonDisabled(QPushButton* button)
 {
-    if (!button->isEnabled()) {
-        return; // it holds nothing, and what others hold is theirs
-    }
     button->setEnabled(false);
     if (APPEventFilter* filter = APPEventFilter::instance()) {
         filter->unlock();

@@ -7,6 +7,7 @@
 #include "document/TitleParserUtility.h"
 #include "support/FolderLookup.h"
 #include "support/IPathManagerEx.h"
+#include "support/Utf8.h"
 
 #include <QFileInfo>
 #include <boost/filesystem.hpp>
@@ -170,7 +171,8 @@ int ArchiveManager::checkFilesUnderFolder(std::string folder)
 bool ArchiveManager::isTitleFile(const std::string& path)
 {
     const QFileInfo file(QString::fromStdString(path));
-    return file.suffix().compare(QLatin1String("xml"), Qt::CaseInsensitive) == 0 &&
+    // An order with a name that is not UTF-8 could not be read again, and would hide all the others.
+    return Utf8::isValid(path) && file.suffix().compare(QLatin1String("xml"), Qt::CaseInsensitive) == 0 &&
            file.fileName().compare(QLatin1String(TitleParser::ORDER_FILEPATH), Qt::CaseInsensitive) != 0;
 }
 

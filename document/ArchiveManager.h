@@ -44,7 +44,8 @@ public:
     // Rows for those of the files that an order file names, numbered from 0.
     static std::vector<ArchiveOrder> orderRowsFor(const std::vector<std::string>& files);
 
-    // Whether a path is that of an XML file other than the order file, whatever the case of its letters.
+    // Whether a path is that of an XML file other than the order file, whatever the case of its letters. A
+    // name that is not UTF-8 is none: such a file is neither shown nor cleaned up.
     static bool isTitleFile(const std::string& path);
 
     // Whether a name in a title file may be that of a picture beside it. A title file of foreign making must

@@ -4,8 +4,10 @@
 #include "document/DocumentConstants.h"
 #include "document/TText.h"
 #include "document/TitleParserUtility.h"
+#include "support/Utf8.h"
 #include "support/XmlFile.h"
 
+#include <algorithm>
 #include <array>
 #include <memory>
 #include <string_view>
@@ -57,28 +59,44 @@ void setDouble(TiXmlElement* element, const char* key, double value)
     element->SetAttribute(key, TitleParserUtility::fromDouble(value).c_str());
 }
 
-// Length of the character at index that XML has no way to write, 0 for all others: control characters, and
-// U+FFFE and U+FFFF.
-std::size_t unwritableAt(std::string_view text, std::size_t index)
+bool isControl(std::string_view text, std::size_t index)
 {
     const auto c = static_cast<unsigned char>(text[index]);
-    if (c < 0x20)
-        return c == '\t' || c == '\n' || c == '\r' ? 0 : 1;
-    const bool isNonCharacter = c == 0xEF && index + 2 < text.size() && text[index + 1] == '\xBF' &&
-                                static_cast<unsigned char>(text[index + 2]) >= 0xBE;
-    return isNonCharacter ? 3 : 0;
+    return c < 0x20 && c != '\t' && c != '\n' && c != '\r';
 }
 
-// A keyboard may send any character. One that XML cannot hold would make the file unreadable for all other
-// processes; a replacement character keeps the count of characters.
+// U+FFFE or U+FFFF.
+bool isNonCharacter(std::string_view text, std::size_t index)
+{
+    const std::string_view bytes = text.substr(index, 3);
+    return bytes == "\xEF\xBF\xBE" || bytes == "\xEF\xBF\xBF";
+}
+
+// Bytes of the character that begins at index, 0 when none does.
+std::size_t lengthAt(std::string_view text, std::size_t index)
+{
+    constexpr std::size_t LONGEST = 4;
+    for (std::size_t length = 1; length <= LONGEST && index + length <= text.size(); ++length) {
+        if (Utf8::isValid(text.substr(index, length)))
+            return length;
+    }
+    return 0;
+}
+
+// A keyboard may send any character, and a file without an encoding bytes that are none. What XML cannot hold
+// would make the file unreadable for all other processes; a replacement character keeps the count of
+// characters.
 std::string writable(const std::string& text)
 {
     static constexpr std::string_view REPLACEMENT = "\xEF\xBF\xBD";
     std::string result;
     for (std::size_t i = 0; i < text.size();) {
-        const std::size_t length = unwritableAt(text, i);
-        result.append(length == 0 ? std::string_view(text).substr(i, 1) : REPLACEMENT);
-        i += length == 0 ? 1 : length;
+        const std::size_t length = lengthAt(text, i);
+        if (length == 0 || isControl(text, i) || isNonCharacter(text, i))
+            result.append(REPLACEMENT);
+        else
+            result.append(text, i, length);
+        i += std::max<std::size_t>(length, 1);
     }
     return result;
 }
@@ -86,10 +104,10 @@ std::string writable(const std::string& text)
 bool isWritable(std::string_view text)
 {
     for (std::size_t i = 0; i < text.size(); ++i) {
-        if (unwritableAt(text, i) != 0)
+        if (isControl(text, i) || isNonCharacter(text, i))
             return false;
     }
-    return true;
+    return Utf8::isValid(text);
 }
 
 void setText(TiXmlElement* element, const char* key, const std::string& value)

@@ -64,7 +64,7 @@ private Q_SLOTS:
     void mouseBesideTheMenuOnlyCloses();
     void menuMarksTheItemUnderTheFinger();
     void disablingLetsGoOfTheTouch();
-    void disabledButtonLeavesTheTouchAlone();
+    void disablingAnotherButtonLeavesTheTouchAlone();
     void textsAreTranslated();
 
 private:
@@ -433,15 +433,20 @@ void TestToolsBar::menuMarksTheItemUnderTheFinger()
     m_bar->hideCanvasMenu();
 }
 
-// It is disabled again with every step that leaves nothing to redo, whoever is touched meanwhile.
-void TestToolsBar::disabledButtonLeavesTheTouchAlone()
+// A step that comes by a timer leaves nothing to redo, whatever is touched meanwhile.
+void TestToolsBar::disablingAnotherButtonLeavesTheTouchAlone()
 {
-    m_bar->changeBtnStatus(false);
+    QSignalSpy clicked(m_bar, &ToolsBar::folderButtonClick);
+    m_bar->changeBtnStatus(true);
     QTest::touchEvent(button("Folder"), m_device).press(0, QPoint(60, 20));
-    m_bar->changeBtnStatus(false);
-    QVERIFY(APPEventFilter::instance()->isLock(nullptr, LOCKMETHOD_TOUCH));
+    for (int i = 0; i < 2; ++i) { // also when it is disabled already
+        m_bar->changeBtnStatus(false);
+        QVERIFY(!button("Delete")->isEnabled());
+        QVERIFY(APPEventFilter::instance()->isLock(nullptr, LOCKMETHOD_TOUCH));
+    }
     QTest::touchEvent(button("Folder"), m_device).release(0, QPoint(60, 20));
     QVERIFY(!APPEventFilter::instance()->isLock(nullptr, LOCKMETHOD_TOUCH));
+    QCOMPARE(clicked.count(), 1);
 }
 
 void TestToolsBar::disablingLetsGoOfTheTouch()

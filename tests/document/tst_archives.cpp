@@ -17,6 +17,8 @@
 #include <QFile>
 #include <QTemporaryDir>
 #include <QtTest/QTest>
+#include <filesystem>
+#include <fstream>
 #include <memory>
 
 namespace
@@ -486,6 +488,27 @@ private slots:
         write(file(".order.xml"), bytes.left(bytes.size() / 2));
         QVERIFY(controller.createNewOrderAccordingToFilesUnderFolder(mFolder));
         QCOMPARE(controller.getFileOrder(mFolder).size(), std::size_t(2));
+    }
+
+    // One could not be read again in an order, and with it none of the others.
+    void namesThatAreNotUtf8HideNothing()
+    {
+        ArchiveController controller;
+        makeTitle("a");
+        makeTitle("b");
+        const std::string foreign = mFolder.toStdString() + "/caf\xE9.xml";
+        QFile title(file("a.xml"));
+        QVERIFY(title.open(QIODevice::ReadOnly));
+        std::ofstream(foreign) << title.readAll().toStdString();
+        QCOMPARE(controller.reCreateOrderXml(), QList<std::string>{mFolder.toStdString()});
+        const QList<Archive*> titles = controller.getArchiveList(mFolder);
+        QCOMPARE(titles.size(), 2);
+        qDeleteAll(titles);
+        // Nor does it go with what the order does not name.
+        setOrder({"b.xml"});
+        controller.deleteUnusefulArchives(mFolder);
+        QVERIFY(!QFile::exists(file("a.xml")));
+        QVERIFY(std::filesystem::exists(foreign));
     }
 
     void uselessTitlesAreDeleted()

@@ -321,6 +321,26 @@ private slots:
         QCOMPARE(loaded.getText()[0]->getTextItems()[0]->getText(), std::string("\uFFFD"));
     }
 
+    // A file without an encoding brings single bytes, which must not make the next file unreadable.
+    void bytesThatAreNoCharactersAreReplaced()
+    {
+        Archive archive;
+        archive.setPath(path("u.xml"));
+        for (const char* bytes : {"caf\xE9", "\xE9\x80", "\xC0\x80z", "\xED\xA0\x80", "\xF5", "a\x80"}) {
+            archive.releaseVectorText();
+            auto* text = new TText;
+            text->setText(bytes);
+            text->setTextItems({new TextStyle});
+            archive.setText({text});
+            QCOMPARE(mParser.writeOneTitle(&archive), 1);
+            Archive loaded;
+            QCOMPARE(mParser.readOneTitle(path("u.xml"), &loaded), 1);
+            const QString read = QString::fromStdString(loaded.text().front()->getText());
+            QVERIFY2(read.contains(QChar::ReplacementCharacter), bytes);
+            QCOMPARE(read, QString::fromUtf8(bytes));
+        }
+    }
+
     void emptyTextIsLostOnTheNextLoad()
     {
         Archive archive;
