@@ -133,9 +133,8 @@ bool KSAppEventFilter::notifyRegEventFilter(QObject* obj, QEvent* event)
         if (asked->eventFilter(obj, event)) {
             return true;
         }
-        if (m_eventFilters.value(i) == asked) {
-            ++i;
-        }
+        const qsizetype place = m_eventFilters.indexOf(asked);
+        i = place < 0 ? i : place + 1;
     }
     return false;
 }
@@ -335,10 +334,20 @@ void KSAppEventFilter::resetLock()
 
 void KSAppEventFilter::registerEventFilter(QObject* obj)
 {
+    insertEventFilter(m_eventFilters.size(), obj);
+}
+
+void KSAppEventFilter::registerPopupFilter(QObject* obj)
+{
+    insertEventFilter(0, obj);
+}
+
+void KSAppEventFilter::insertEventFilter(qsizetype place, QObject* obj)
+{
     if (obj == nullptr || m_eventFilters.contains(obj)) {
         return;
     }
-    m_eventFilters.append(obj);
+    m_eventFilters.insert(place, obj);
     connect(obj, &QObject::destroyed, this, [this](QObject* gone) { m_eventFilters.removeAll(gone); });
 }
 

@@ -40,6 +40,9 @@ public:
     // The object's eventFilter() is asked for every widget event that passes the gate, in the order of
     // registration. A deleted object leaves by itself.
     virtual void registerEventFilter(QObject* obj);
+    // The same for what is open only for the moment: it is asked before all others, which may keep every
+    // press to themselves meanwhile.
+    void registerPopupFilter(QObject* obj);
     virtual void unegisterEventFilter(QObject* obj);
 
     virtual bool doEventFilter(QObject* obj, QEvent* event);
@@ -96,6 +99,7 @@ Q_SIGNALS:
 
 private:
     static int priorityOf(LOCKOBJECT_TYPE type);
+    void insertEventFilter(qsizetype place, QObject* obj);
     void watchIgnoredTouch(QEvent* event);
     void noticeAcceptedTouch(const QObject* obj);
 

@@ -16,7 +16,7 @@ void OutsidePressFilter::start()
     m_watching = true;
     m_gate = KSAppEventFilter::current();
     if (m_gate != nullptr) {
-        m_gate->registerEventFilter(this);
+        m_gate->registerPopupFilter(this);
     } else {
         QCoreApplication::instance()->installEventFilter(this);
     }

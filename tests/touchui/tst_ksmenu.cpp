@@ -24,6 +24,7 @@ private Q_SLOTS:
     void otherButtonsChooseNothing();
     void pressOutsideClosesAndPressesNothing_data();
     void pressOutsideClosesAndPressesNothing();
+    void pressOutsideClosesItBeforeOthersTakeIt();
     void refusedFingerOutsideLeavesItOpen();
     void fingerThatOpenedItIsLiftedForItsWidget();
     void closesByItsTimer();
@@ -199,6 +200,30 @@ void TestKSMenu::pressOutsideClosesAndPressesNothing()
     tapButton(); // the next one presses again
     QCOMPARE(clicked.count(), 1);
     QVERIFY(!m_touch->isLocked());
+}
+
+// As the window does while the slider of the edge is open.
+void TestKSMenu::pressOutsideClosesItBeforeOthersTakeIt()
+{
+    class Eater : public QObject
+    {
+    public:
+        bool eventFilter(QObject*, QEvent* event) override
+        {
+            const bool touch = event->type() == QEvent::TouchBegin || event->type() == QEvent::TouchEnd;
+            eaten += touch ? 1 : 0;
+            return touch;
+        }
+        int eaten = 0;
+    };
+    Eater eater;
+    m_touch->filter->registerEventFilter(&eater);
+    open();
+    m_touch->tap(m_button, QPoint(20, 20));
+    QVERIFY(!m_menu->isVisible());
+    QCOMPARE(eater.eaten, 0);
+    m_touch->tap(m_button, QPoint(20, 20));
+    QCOMPARE(eater.eaten, 2);
 }
 
 // A touch that the locks refuse, here a second finger's, reaches nobody.
