@@ -437,12 +437,14 @@ void ArchiveList::synchronizationFolderFile()
         return;
     // Without an order, which a full disk did not take, or with a torn one the clean-up would count every
     // title as deleted. The next start makes one from what the folder holds.
-    const auto namesNothing = [this] { return mController->getFileOrder(mCurrentPath).empty(); };
-    if (!isEmpty() && namesNothing())
-        saveArchiveListOrder();
     const QString order = mCurrentPath + QLatin1Char('/') + QLatin1String(TitleParser::ORDER_FILEPATH);
     TiXmlDocument document;
-    const bool isReadable = XmlFile::load(order.toStdString(), document);
-    if (isReadable && (isEmpty() || !namesNothing()))
+    const auto isReadable = [&] {
+        return XmlFile::load(order.toStdString(), document) && document.RootElement();
+    };
+    const auto namesTitles = [&] { return isReadable() && document.RootElement()->FirstChildElement(); };
+    if (!isEmpty() && !namesTitles())
+        saveArchiveListOrder();
+    if (isEmpty() ? isReadable() : namesTitles())
         mController->deleteUnusefulArchives(mCurrentPath);
 }
