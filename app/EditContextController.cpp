@@ -40,7 +40,7 @@ void EditContextController::showTitlerCreate(_CALL_TITLER_TYPE type)
     mCallType = type;
     mIsCreate = true;
     mFileList.clear();
-    emit signalShowTitlerParameter({_titler_paramter::CREATE_OR_EDIT, {}});
+    Q_EMIT signalShowTitlerParameter({_titler_paramter::CREATE_OR_EDIT, {}});
 }
 
 void EditContextController::showTitlerEdit(const _SHOW_TITLER_PARAMTER& param)
@@ -48,7 +48,7 @@ void EditContextController::showTitlerEdit(const _SHOW_TITLER_PARAMTER& param)
     mIsCreate = false;
     mCallType = param.type;
     if (!param.path.empty())
-        emit signalShowTitlerParameter({_titler_paramter::CREATE_OR_EDIT, param.path});
+        Q_EMIT signalShowTitlerParameter({_titler_paramter::CREATE_OR_EDIT, param.path});
 }
 
 void EditContextController::resultCallBack(ITitlerCallBack* callBack)

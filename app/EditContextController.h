@@ -46,7 +46,7 @@ public:
     // callback, or outside a create session, nothing happens.
     void sentITitlerCallBack(const std::wstring& folder);
 
-signals:
+Q_SIGNALS:
     void signalShowTitlerParameter(titler_paramter paramter);
 
 private:

@@ -110,33 +110,33 @@ void EditTitlerController::importNotify(FileManagerDefine::tagImportNotify notif
                                    static_cast<std::uint64_t>(static_cast<std::uint32_t>(notify.fileTypeHigh))
                                        << 32;
     if (fileType == FileManagerDefine::FILE_TYPE_FONT)
-        emit importNewFontFamilies(QString::fromStdWString(notify.path));
+        Q_EMIT importNewFontFamilies(QString::fromStdWString(notify.path));
     else if (fileType == FileManagerDefine::FILE_TYPE_TITLER_TEMPLATE)
-        emit importNewUserTemplate(QString::fromStdWString(notify.path));
+        Q_EMIT importNewUserTemplate(QString::fromStdWString(notify.path));
 }
 
 void EditTitlerController::deleteNotify(FileManagerDefine::tagDeleteNotify notify)
 {
     if (notify.result == 0 && notify.fileType == FileManagerDefine::FILE_TYPE_TITLER_TEMPLATE)
-        emit deleteUserTemplate(QString::fromStdWString(notify.path));
+        Q_EMIT deleteUserTemplate(QString::fromStdWString(notify.path));
 }
 
 void EditTitlerController::renameTitlerTemplateNotify(FileManagerDefine::tagRenameNotify notify)
 {
     if (notify.fileType != FileManagerDefine::FILE_TYPE_TITLER_TEMPLATE)
         return;
-    emit renameUserTemplate(QString::fromStdWString(notify.strings[0]),
-                            QString::fromStdWString(notify.strings[2]),
-                            QString::fromStdWString(notify.strings[3]));
+    Q_EMIT renameUserTemplate(QString::fromStdWString(notify.strings[0]),
+                              QString::fromStdWString(notify.strings[2]),
+                              QString::fromStdWString(notify.strings[3]));
 }
 
 void EditTitlerController::updateTitlerFolderInFileManagerDelete(std::wstring folder)
 {
-    emit folderDeleteFromFileManager(std::move(folder));
+    Q_EMIT folderDeleteFromFileManager(std::move(folder));
 }
 
 void EditTitlerController::updateFolderNameInCurrentProjectNotify(
     FileManagerDefine::tagChangeFolderNameParam param)
 {
-    emit folderNameChangeFromFileManager(std::move(param));
+    Q_EMIT folderNameChangeFromFileManager(std::move(param));
 }

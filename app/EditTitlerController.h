@@ -47,7 +47,7 @@ public:
     void updateTitlerFolderInFileManagerDelete(std::wstring folder) override;
     void updateFolderNameInCurrentProjectNotify(FileManagerDefine::tagChangeFolderNameParam param) override;
 
-signals:
+Q_SIGNALS:
     void importNewFontFamilies(QString path);
     void importNewUserTemplate(QString path);
     void deleteUserTemplate(QString path);

@@ -118,25 +118,25 @@ bool ShowMessageController::mainWindowIsShown() const
 void ShowMessageController::showDialogOpacityWidget()
 {
     if (mainWindowIsShown())
-        emit signalsShowDialogMaskWidget(true);
+        Q_EMIT signalsShowDialogMaskWidget(true);
 }
 
 void ShowMessageController::hideDialogOpacityWidget()
 {
     if (mainWindowIsShown())
-        emit signalsShowDialogMaskWidget(false);
+        Q_EMIT signalsShowDialogMaskWidget(false);
 }
 
 void ShowMessageController::showMessageOpacityWidget()
 {
     if (mainWindowIsShown())
-        emit signalsShowMessageMaskWidget(true);
+        Q_EMIT signalsShowMessageMaskWidget(true);
 }
 
 void ShowMessageController::hideMessageOpacityWidget()
 {
     if (mainWindowIsShown())
-        emit signalsShowMessageMaskWidget(false);
+        Q_EMIT signalsShowMessageMaskWidget(false);
 }
 
 void ShowMessageController::getTopWindowNotify(int top)
@@ -152,5 +152,5 @@ void ShowMessageController::postMessageNotify(MessageDefine::_tagMessageParam pa
 
 void ShowMessageController::closeMessageNotify(MessageDefine::_tagCloseParam param)
 {
-    emit signalCloseMessage(param);
+    Q_EMIT signalCloseMessage(param);
 }

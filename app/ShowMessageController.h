@@ -54,7 +54,7 @@ public:
     void closeMessageNotify(MessageDefine::_tagCloseParam param) override;
     void showBarNotify(int) override {}
 
-signals:
+Q_SIGNALS:
     void signalsShowDialogMaskWidget(bool show);
     void signalsShowMessageMaskWidget(bool show);
 

@@ -47,5 +47,5 @@ void ShowTitlerController::changeFolderStatus(SubCommonDefine::tagFOLDER_TYPE fo
 
 void ShowTitlerController::showTitler()
 {
-    emit signalShowTitlerParameter({_titler_paramter::SUB_PANEL, {}});
+    Q_EMIT signalShowTitlerParameter({_titler_paramter::SUB_PANEL, {}});
 }

@@ -25,7 +25,7 @@ public:
 
     void showTitler() override;
 
-signals:
+Q_SIGNALS:
     void signalShowTitlerParameter(titler_paramter paramter);
 
 private:

@@ -63,7 +63,8 @@ void SystemSetupInfoController::getClientID(int id)
 
 void SystemSetupInfoController::getInputLanguage()
 {
-    emit signalsInputLanguageInfo(static_cast<SystemSetupDef::emInputLanguageType>(mLanguage.inputLanguage));
+    Q_EMIT signalsInputLanguageInfo(
+        static_cast<SystemSetupDef::emInputLanguageType>(mLanguage.inputLanguage));
 }
 
 void SystemSetupInfoController::getModuleInfo()
@@ -82,18 +83,18 @@ void SystemSetupInfoController::getLanguageInfoCallBack(SystemSetupDef::tagSyste
 {
     mLanguage = param;
     getInputLanguage();
-    emit signalsSystemLanguageInfo(static_cast<SystemSetupDef::emSystemLanguageType>(param.systemLanguage));
+    Q_EMIT signalsSystemLanguageInfo(static_cast<SystemSetupDef::emSystemLanguageType>(param.systemLanguage));
 }
 
 void SystemSetupInfoController::getInformationCallBack(SystemSetupDef::tagSystemInformation information)
 {
-    emit signalsSystemInfo(static_cast<SystemSetupDef::emInformationModel>(information.model));
+    Q_EMIT signalsSystemInfo(static_cast<SystemSetupDef::emInformationModel>(information.model));
 }
 
 void SystemSetupInfoController::setSystemLanguageNotify(int language)
 {
     mLanguage.systemLanguage = language;
-    emit signalsSystemLanguageInfo(static_cast<SystemSetupDef::emSystemLanguageType>(language));
+    Q_EMIT signalsSystemLanguageInfo(static_cast<SystemSetupDef::emSystemLanguageType>(language));
 }
 
 void SystemSetupInfoController::setInputLanguageNotify(int language)

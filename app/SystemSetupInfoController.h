@@ -37,7 +37,7 @@ public:
     void setSystemLanguageNotify(int language) override;
     void setInputLanguageNotify(int language) override;
 
-signals:
+Q_SIGNALS:
     void signalsSystemLanguageInfo(SystemSetupDef::emSystemLanguageType language);
     void signalsSystemInfo(SystemSetupDef::emInformationModel model);
 

@@ -70,22 +70,22 @@ void TitlerAPPEventFilterController::informRestoreOriginal(APPEventDefine::Event
         mProxy->postRestoreOriginal(
             {mClientId, APPEventDefine::LOCKTYPE_NONE, false, APPEventDefine::EVENTREVICER_TITLER});
     if (receiver == APPEventDefine::EVENTREVICER_RESTORE_ALL)
-        emit signalRestoreOriginal();
+        Q_EMIT signalRestoreOriginal();
 }
 
 void TitlerAPPEventFilterController::postAPPEventFilterNotify(APPEventDefine::_tagAPPEvent event)
 {
     if (event.eventReceiver != APPEventDefine::EVENTREVICER_TITLER)
-        emit signalSendAPPEvent(event);
+        Q_EMIT signalSendAPPEvent(event);
 }
 
 void TitlerAPPEventFilterController::postRestoreOriginalNotify(APPEventDefine::_tagAPPEvent event)
 {
     if (event.eventReceiver != APPEventDefine::EVENTREVICER_TITLER)
-        emit signalRestoreOriginal();
+        Q_EMIT signalRestoreOriginal();
 }
 
 void TitlerAPPEventFilterController::postRestoreFocusNotify()
 {
-    emit signalRestoreFocus();
+    Q_EMIT signalRestoreFocus();
 }

@@ -63,10 +63,10 @@ void TitlerPowerController::getClientID(int id)
 
 void TitlerPowerController::powerOff()
 {
-    emit signalPowerOff();
+    Q_EMIT signalPowerOff();
 }
 
 void TitlerPowerController::powerOn()
 {
-    emit signalPowerOn();
+    Q_EMIT signalPowerOn();
 }

@@ -24,7 +24,7 @@ public:
     void powerOff() override;
     void powerOn() override;
 
-signals:
+Q_SIGNALS:
     void signalPowerOn();
     void signalPowerOff();
 

@@ -352,7 +352,7 @@ void TitlerWindow::resizeEvent(QResizeEvent* event)
     DrawBoundingRectangle frames;
     mLeftPanelPixmap = frames.paintBoundingRectangle(2);
     mWindowPanelPixmap = frames.paintBoundingRectangle(1);
-    emit titlerWindowGeometry(geometry());
+    Q_EMIT titlerWindowGeometry(geometry());
     QMainWindow::resizeEvent(event);
 }
 

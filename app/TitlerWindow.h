@@ -77,13 +77,13 @@ public:
 
     bool archiveListIsMoveMode() const;
 
-signals:
+Q_SIGNALS:
     void moveButtonClicked(bool isMoveMode);
     void titlerWindowGeometry(QRect rect);
     void modifyFontComboxItem(bool isAllItems);
     void signalHideEdgeSlider();
 
-public slots:
+public Q_SLOTS:
     // Closing.
     void closeTitlerWindow();
     void continueCloseTitler(MessageDefine::tagCloseParam param);

@@ -153,7 +153,7 @@ void TitlerWindow::changeMoveMode(bool on)
     mMoveButton->changeButtonState(on ? KSPushbutton::ButtonSelectedRest : KSPushbutton::ButtonRest);
     mMoveButton->setSelected(on);
     m_bMoveModeOff = !on;
-    emit moveButtonClicked(on);
+    Q_EMIT moveButtonClicked(on);
 }
 
 void TitlerWindow::slotChangeDoneToMoveMode()
@@ -362,5 +362,5 @@ void TitlerWindow::useSpecifiedFont(SystemSetupDef::emSystemLanguageType type)
 
 void TitlerWindow::changeFontComboxItem(SystemSetupDef::emInformationModel moduleInfo)
 {
-    emit modifyFontComboxItem(moduleInfo != SystemSetupDef::emInformationModelChina);
+    Q_EMIT modifyFontComboxItem(moduleInfo != SystemSetupDef::emInformationModelChina);
 }

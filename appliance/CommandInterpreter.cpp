@@ -33,7 +33,7 @@ CommandInterpreter::CommandInterpreter(Appliance& appliance, Appliance::EventSin
     addWaitCommands();
     m_handlers["quit"] = [this](const CommandLine&) {
         m_lines.clear();
-        emit quitRequested();
+        Q_EMIT quitRequested();
         return QString();
     };
 }
@@ -63,7 +63,7 @@ void CommandInterpreter::runLines()
     }
     if (m_inputEnded && m_waitCondition == nullptr) {
         m_inputEnded = false;
-        emit quitRequested();
+        Q_EMIT quitRequested();
     }
 }
 

@@ -34,7 +34,7 @@ public:
     // Asks for the end once all lines are carried out.
     void endOfInput();
 
-signals:
+Q_SIGNALS:
     void quitRequested();
 
 private:

@@ -21,9 +21,9 @@ void LineReader::readMore()
     } else if (count == 0 || (errno != EINTR && errno != EAGAIN)) {
         m_notifier.setEnabled(false);
         if (!m_buffer.isEmpty()) {
-            emit lineRead(QString::fromUtf8(std::exchange(m_buffer, QByteArray())));
+            Q_EMIT lineRead(QString::fromUtf8(std::exchange(m_buffer, QByteArray())));
         }
-        emit ended();
+        Q_EMIT ended();
     }
 }
 
@@ -33,7 +33,7 @@ void LineReader::emitLines()
     while (end != -1 || m_buffer.size() > MAX_LINE) {
         const QByteArray line = m_buffer.left(end != -1 ? end : MAX_LINE);
         m_buffer.remove(0, end != -1 ? end + 1 : MAX_LINE);
-        emit lineRead(QString::fromUtf8(line));
+        Q_EMIT lineRead(QString::fromUtf8(line));
         end = m_buffer.indexOf('\n');
     }
 }

@@ -16,7 +16,7 @@ public:
     // The descriptor stays the caller's and must be readable.
     explicit LineReader(int descriptor, QObject* parent = nullptr);
 
-signals:
+Q_SIGNALS:
     // UTF-8 without the line end.
     void lineRead(const QString& line);
     void ended();

@@ -1,7 +1,7 @@
 # Options that every target of this project shares.
 add_library(titler_options INTERFACE)
 target_include_directories(titler_options INTERFACE ${CMAKE_SOURCE_DIR})
-target_compile_definitions(titler_options INTERFACE QT_DEPRECATED_WARNINGS)
+target_compile_definitions(titler_options INTERFACE QT_DEPRECATED_WARNINGS QT_NO_KEYWORDS)
 target_compile_options(titler_options INTERFACE -Wall -Wextra -Wpedantic -Wshadow -Wnon-virtual-dtor -Woverloaded-virtual)
 if(TITLER_WERROR)
     target_compile_options(titler_options INTERFACE -Werror)
@@ -15,10 +15,65 @@ if(TITLER_SANITIZE)
     target_link_options(titler_options INTERFACE -fsanitize=${TITLER_SANITIZERS})
 endif()
 
+# Most of the time of a compilation goes into reading Qt's and the standard library's headers. They are precompiled once
+# for each set of Qt modules, since a module's macro changes what its headers mean: Core, Core and Gui, all three.
+option(TITLER_PRECOMPILE "Precompile the headers of Qt and of the standard library" ON)
+set(TITLER_PRECOMPILED_Core <algorithm> <array> <atomic> <cstdint> <cstring> <deque> <functional> <map> <memory> <mutex>
+    <optional> <string> <thread> <utility> <vector> <QByteArray> <QCoreApplication> <QDir> <QFile> <QFileInfo> <QHash>
+    <QList> <QMap> <QMutex> <QObject> <QPointer> <QString> <QStringList> <QThread> <QTimer> <QVariant>)
+set(TITLER_PRECOMPILED_Gui ${TITLER_PRECOMPILED_Core} <QColor> <QFont> <QFontMetrics> <QGuiApplication> <QImage>
+    <QImageReader> <QPainter> <QPixmap> <QTransform>)
+set(TITLER_PRECOMPILED_Widgets ${TITLER_PRECOMPILED_Gui} <QAbstractItemView> <QAction> <QApplication> <QComboBox> <QDialog>
+    <QGraphicsScene> <QGraphicsTextItem> <QGraphicsView> <QHBoxLayout> <QKeyEvent> <QLabel> <QLineEdit> <QMouseEvent>
+    <QPainterPath> <QPushButton> <QScrollBar> <QStyle> <QTextCursor> <QTextDocument> <QTextLayout> <QTouchEvent>
+    <QUndoStack> <QVBoxLayout> <QWidget>)
+if(TITLER_PRECOMPILE)
+    file(CONFIGURE OUTPUT ${CMAKE_BINARY_DIR}/precompiled/nothing.cpp CONTENT "")
+    foreach(module Core Gui Widgets)
+        add_library(titler_precompiled_${module} OBJECT ${CMAKE_BINARY_DIR}/precompiled/nothing.cpp)
+        target_link_libraries(titler_precompiled_${module} PRIVATE titler_options Qt6::${module})
+        target_precompile_headers(titler_precompiled_${module} PRIVATE ${TITLER_PRECOMPILED_${module}})
+        set_target_properties(titler_precompiled_${module} PROPERTIES AUTOMOC OFF AUTORCC OFF)
+    endforeach()
+endif()
+
+# titler_qt_modules(RESULT TARGET) adds to RESULT the Qt modules that TARGET links directly or through others.
+function(titler_qt_modules result target)
+    set(found ${${result}})
+    get_target_property(links ${target} LINK_LIBRARIES)
+    foreach(link IN LISTS links)
+        if(link MATCHES "^Qt6::(Core|Gui|Widgets)$")
+            list(APPEND found ${CMAKE_MATCH_1})
+        elseif(link MATCHES "^titler_" AND NOT link STREQUAL titler_options AND TARGET ${link})
+            titler_qt_modules(found ${link})
+        endif()
+    endforeach()
+    set(${result} ${found} PARENT_SCOPE)
+endfunction()
+
+# titler_precompile(TARGET) gives TARGET the precompiled headers of the Qt modules that it links. What it links must be
+# known by then.
+function(titler_precompile target)
+    set(modules)
+    titler_qt_modules(modules ${target})
+    foreach(module Widgets Gui Core)
+        if(TITLER_PRECOMPILE AND module IN_LIST modules)
+            target_precompile_headers(${target} REUSE_FROM titler_precompiled_${module})
+            return()
+        endif()
+    endforeach()
+endfunction()
+
+# titler_precompile_later(TARGET) does so at the end of the folder's CMakeLists.txt.
+macro(titler_precompile_later target)
+    cmake_language(EVAL CODE "cmake_language(DEFER CALL titler_precompile [[${target}]])")
+endmacro()
+
 # titler_add_library(NAME SOURCES... ) makes the static library of one source folder.
 function(titler_add_library name)
     add_library(${name} STATIC ${ARGN})
     target_link_libraries(${name} PUBLIC titler_options)
+    titler_precompile_later(${name})
 endfunction()
 
 include(TitlerFonts)
@@ -67,6 +122,7 @@ function(titler_add_test name)
     add_executable(${name} ${name}.cpp)
     target_link_libraries(${name} PRIVATE titler_options Qt6::Test ${ARGN})
     set_target_properties(${name} PROPERTIES RUNTIME_OUTPUT_DIRECTORY ${TITLER_TEST_DIR})
+    titler_precompile_later(${name})
     add_dependencies(${name} titler_fonts)
     add_test(NAME ${name} COMMAND ${name})
     titler_set_test(${name} 120 QT_QPA_PLATFORM=offscreen)

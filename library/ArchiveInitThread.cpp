@@ -33,5 +33,5 @@ void ArchiveInitThread::run()
             return;
         }
     }
-    emit threadGetArchiveListFinished(archives);
+    Q_EMIT threadGetArchiveListFinished(archives);
 }

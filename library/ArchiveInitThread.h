@@ -24,7 +24,7 @@ public:
     // receiver has to go on handling events until the thread has finished. Any thread.
     void cancel() { mCancelled = true; }
 
-signals:
+Q_SIGNALS:
     // The records pass to the receiver. Sent from this thread, to be connected with
     // Qt::BlockingQueuedConnection.
     void threadGetArchiveListFinished(QList<Archive*> archives);

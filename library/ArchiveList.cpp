@@ -144,11 +144,11 @@ void ArchiveList::getArchiveListSuccessed(QList<Archive*> archivesList)
     clearOldArchiveList();
     addRecords(archivesList);
     if (isEmpty()) {
-        emit startTemplatePicker();
+        Q_EMIT startTemplatePicker();
         return;
     }
     selectArchive(0);
-    emit signalAddArchiveData();
+    Q_EMIT signalAddArchiveData();
 }
 
 void ArchiveList::addRecords(const QList<Archive*>& archives)
@@ -182,7 +182,7 @@ ArchiveItem* ArchiveList::createPasteUndoItem(Archive* archive, ArchiveItem* ite
 void ArchiveList::slotAddArchiveData()
 {
     for (int i = 0; i < count(); ++i)
-        emit signalAddOneArchiveData(archiveItem(i));
+        Q_EMIT signalAddOneArchiveData(archiveItem(i));
 }
 
 void ArchiveList::slotAddOneArchiveData(ArchiveItem* item)
@@ -254,7 +254,7 @@ void ArchiveList::selectArchive(int index)
         saveLastArchivePathAndNotifyCanvasUpdate(item);
     } else {
         mSelectedItem.clear();
-        emit signalUpdateCanvas(nullptr);
+        Q_EMIT signalUpdateCanvas(nullptr);
     }
 }
 
@@ -285,7 +285,7 @@ void ArchiveList::setDefaultItemState(ArchiveItem* item)
         return;
     item->setStyleSheet(ArchiveItem::UN_OPERATE_AND_UN_SELECT_STATE);
     item->setSelected(false);
-    emit itemSetDefaultState();
+    Q_EMIT itemSetDefaultState();
 }
 
 void ArchiveList::setOperationItemState(ArchiveItem* item)
@@ -317,7 +317,7 @@ void ArchiveList::saveLastArchivePathAndNotifyCanvasUpdate(ArchiveItem* item)
     if (!item)
         return;
     mController->setLastArchivePath(item->getArchiveDataPath());
-    emit signalUpdateCanvas(item->getArchiveData());
+    Q_EMIT signalUpdateCanvas(item->getArchiveData());
 }
 
 void ArchiveList::moveCurrentArchiveItemVisble()
@@ -347,7 +347,7 @@ void ArchiveList::itemReleasedEvent(KSBaseItemWidget* released, QPoint, KSScroll
             setSelectItemState(item);
             setDefaultItemState(old);
             saveLastArchivePathAndNotifyCanvasUpdate(item);
-            emit focusCommandSignal(new FocusArchiveCommand(this, item, old));
+            Q_EMIT focusCommandSignal(new FocusArchiveCommand(this, item, old));
         }
     }
     mLongHold = false;
@@ -374,7 +374,7 @@ void ArchiveList::saveArchiveListOrder()
 
 void ArchiveList::startPicker()
 {
-    emit startTemplatePicker();
+    Q_EMIT startTemplatePicker();
 }
 
 void ArchiveList::refreshBaseItem(QString archiveFilePath, QImage leftImage)

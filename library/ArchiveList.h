@@ -96,7 +96,7 @@ public:
     bool checkArchiveListIsFull() const;
     bool checkDiskSpaceIsFull() const;
 
-signals:
+Q_SIGNALS:
     // Null: there is no title to show. The record stays the list's.
     void signalUpdateCanvas(const Archive* archive);
     // The receiver owns the command.
@@ -118,7 +118,7 @@ signals:
     void signalAddOneArchiveData(ArchiveItem* item);
     void signalStartPasteArchive();
 
-public slots:
+public Q_SLOTS:
     void slotHideOptionMenu();
     void slotMenuAboutToClose();
     void slotDragOneItem(KSBaseItemWidget* item, int index, KSScrollViewerWidget* scrollArea);

@@ -41,12 +41,12 @@ void ArchiveList::openFolder(const QString& path)
 void ArchiveList::refreshArchiveList(QString path)
 {
     openFolder(path);
-    emit signalAddArchiveData();
+    Q_EMIT signalAddArchiveData();
     if (!isEmpty() && !isCreateNew()) {
         selectArchive(0);
     } else if (!checkArchiveListIsFull()) {
-        emit signalUpdateCanvas(nullptr);
-        emit startTemplatePicker();
+        Q_EMIT signalUpdateCanvas(nullptr);
+        Q_EMIT startTemplatePicker();
     } else {
         selectArchive(0);
         ListMessages::post(MessageDef::MESSAGE_LIST_FULL_ON_CREATE, ListMessages::limitText());
@@ -57,7 +57,7 @@ void ArchiveList::refreshArchiveListInFile(QString path, QString fileName)
 {
     LOG_DEBUG_OPERATE(L"ArchiveList", 200, L" File:" + fileName.toStdWString());
     openFolder(path);
-    emit signalAddArchiveData();
+    Q_EMIT signalAddArchiveData();
 
     ArchiveItem* wanted = nullptr;
     const QString filePath = path + QLatin1Char('/') + fileName;
@@ -71,8 +71,8 @@ void ArchiveList::refreshArchiveListInFile(QString path, QString fileName)
         offerTemplateOrReportFull();
     } else if (!wanted) {
         if (isEmpty()) {
-            emit signalUpdateCanvas(nullptr);
-            emit startTemplatePicker();
+            Q_EMIT signalUpdateCanvas(nullptr);
+            Q_EMIT startTemplatePicker();
         } else {
             selectArchive(0);
         }
@@ -84,7 +84,7 @@ void ArchiveList::offerTemplateOrReportFull()
     if (checkArchiveListIsFull())
         ListMessages::post(MessageDef::MESSAGE_LIST_FULL_ON_CREATE, ListMessages::limitText());
     else
-        emit startTemplatePicker();
+        Q_EMIT startTemplatePicker();
 }
 
 void ArchiveList::refreshArchiveListForChangeFolderName(QString before, QString after)
@@ -105,9 +105,9 @@ void ArchiveList::refreshArchiveListForChangeFolderName(QString before, QString 
     resetPositions();
     initArchiveListRefreshData();
     if (isEmpty()) {
-        emit startTemplatePicker();
+        Q_EMIT startTemplatePicker();
         return;
     }
     selectArchive(qBound(0, selected, count() - 1));
-    emit signalAddArchiveData();
+    Q_EMIT signalAddArchiveData();
 }

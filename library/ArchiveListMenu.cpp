@@ -102,7 +102,7 @@ void ArchiveList::showOptionMenu(KSBaseItemWidget* pressed, QPoint pos, KSScroll
                                                                      : MenuPlacement::Above);
     mMenu->popup(anchor);
     sendTitlerAppEvent(true);
-    emit archiveListMenuShow();
+    Q_EMIT archiveListMenuShow();
 }
 
 void ArchiveList::sendTitlerAppEvent(bool open)
@@ -175,7 +175,7 @@ void ArchiveList::exeCreateArchive()
     else if (checkDiskSpaceIsFull())
         ListMessages::post(MessageDef::MESSAGE_DISK_FULL_ON_CREATE, tr("File"));
     else
-        emit startTemplatePicker();
+        Q_EMIT startTemplatePicker();
 }
 
 void ArchiveList::createArchiveFromTemplate(Archive* temp)
@@ -201,7 +201,7 @@ void ArchiveList::emitPasteCommand(std::unique_ptr<Archive> archive)
     mSelectedPosition = getItemIndex(mSelectedItem);
     Archive* record = archive.release();
     mArchives.append(record);
-    emit pasteCommandSignal(new PasteArchiveCommand(this, record, mOperationPosition, mSelectedPosition));
+    Q_EMIT pasteCommandSignal(new PasteArchiveCommand(this, record, mOperationPosition, mSelectedPosition));
 }
 
 void ArchiveList::clearCopyArchive()
@@ -251,7 +251,7 @@ void ArchiveList::exePasteArchive()
     if (mCopyDecoder.valid())
         mCopyBackground = BackgroundPicture::load(mCopyDecoder.get());
     emitPasteCommand(std::move(archive));
-    emit signalStartPasteArchive();
+    Q_EMIT signalStartPasteArchive();
 }
 
 void ArchiveList::exeDeleteArchive()
@@ -264,7 +264,7 @@ void ArchiveList::exeDeleteArchive()
         return;
     mOperationPosition = position;
     mSelectedPosition = getItemIndex(mSelectedItem);
-    emit deleteCommandSignal(
+    Q_EMIT deleteCommandSignal(
         new DeleteArchiveCommand(this, mOperationItem, position, mOperationItem == mSelectedItem));
 }
 
@@ -293,8 +293,8 @@ void ArchiveList::exeAddUserArchive()
         return;
     TitleReports::titleChanged(FileManagerDefine::TITLE_TEMPLATE_ADDED,
                                QFileInfo(QString::fromStdString(target->getPath())).path());
-    emit addUserSignal(QFileInfo(QString::fromStdString(target->getName())).path());
-    emit startUserTemplatePicker();
+    Q_EMIT addUserSignal(QFileInfo(QString::fromStdString(target->getName())).path());
+    Q_EMIT startUserTemplatePicker();
 }
 
 // The title on the canvas must have been written out before it can be copied. It stays selected, which is not

@@ -7,7 +7,7 @@
 void ArchiveList::moveButtonClicked(bool isMoveMode)
 {
     mMoveMode = isMoveMode ? 1 : 0;
-    emit signalItemsCanDrag(isMoveMode);
+    Q_EMIT signalItemsCanDrag(isMoveMode);
     if (!isMoveMode)
         clearOperationItemState(mOperationItem);
 }
@@ -52,6 +52,6 @@ void ArchiveList::slotItemDrop()
     setOperationItemState(item);
     mMoveDestination = position;
     if (mMoveSource != mMoveDestination)
-        emit moveCommandSignal(new MoveArchiveCommand(this, item, mMoveSource, mMoveDestination, nullptr));
+        Q_EMIT moveCommandSignal(new MoveArchiveCommand(this, item, mMoveSource, mMoveDestination, nullptr));
     mDraggedItem.clear();
 }

@@ -11,10 +11,10 @@ QValidator::State EditorRegExpValidator::validate(QString& input, int& position)
 {
     const State state = QRegularExpressionValidator::validate(input, position);
     if (FolderNameRules::isTooLong(input))
-        emit longText();
+        Q_EMIT longText();
     else if (state == Invalid)
-        emit invalidText();
+        Q_EMIT invalidText();
     else
-        emit validText();
+        Q_EMIT validText();
     return state;
 }

@@ -13,7 +13,7 @@ public:
     // The verdict of the pattern; every call sends one of the signals.
     State validate(QString& input, int& position) const override;
 
-signals:
+Q_SIGNALS:
     void longText() const;
     void invalidText() const;
     void validText() const;

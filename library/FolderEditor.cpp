@@ -62,7 +62,7 @@ bool FolderEditor::event(QEvent* event)
     case QEvent::TouchCancel:
         return handleTouch(static_cast<QTouchEvent*>(event));
     case KSInputContext::SoftKeyBoardCloseType:
-        emit signalPressedClose();
+        Q_EMIT signalPressedClose();
         return true;
     default:
         return QLineEdit::event(event);
@@ -114,11 +114,11 @@ void FolderEditor::keyPressEvent(QKeyEvent* event)
     case Qt::Key_Enter:
     case Qt::Key_Return:
         event->accept();
-        emit signalPressedEnter();
+        Q_EMIT signalPressedEnter();
         return;
     case Qt::Key_Escape:
         event->accept();
-        emit signalPressedEscape();
+        Q_EMIT signalPressedEscape();
         return;
     default:
         QLineEdit::keyPressEvent(event);
@@ -150,6 +150,6 @@ void FolderEditor::hideEvent(QHideEvent* event)
     QLineEdit::hideEvent(event);
     if (isHidden() && !mEnded) {
         mEnded = true;
-        emit signalEditStateEnd();
+        Q_EMIT signalEditStateEnd();
     }
 }

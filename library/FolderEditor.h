@@ -20,7 +20,7 @@ public:
 
     explicit FolderEditor(QWidget* parent = nullptr);
 
-signals:
+Q_SIGNALS:
     // What was typed or pasted is refused for its characters, for its length, or taken.
     void signalInvalidInput();
     void signalLongInput();

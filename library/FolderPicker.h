@@ -87,7 +87,7 @@ public:
     FolderEditor* editor() const;
     FolderEdit editAction() const { return mAction; }
 
-signals:
+Q_SIGNALS:
     // Full paths of folders; the name of a title file.
     void changeFolderPath(QString path);
     void changeFolderFile(QString path, QString fileName);
@@ -96,7 +96,7 @@ signals:
     void clearUndoCommandStack();
     void signalCancelClicked();
 
-public slots:
+public Q_SLOTS:
     void createFolder();
     void duplicateFolder();
     void openFolder();

@@ -281,10 +281,10 @@ void FolderPicker::openFolder()
     const QString name = nameOf(folderOf(current));
     mKeepDialog = false;
     if (checkItemisFolder(current)) {
-        emit changeFolderPath(folderPath(name));
+        Q_EMIT changeFolderPath(folderPath(name));
     } else {
         const QFileInfo title = mFactory->getNodeInfo(mModel->itemOf(current)->dataItem()->getSourceData());
-        emit changeFolderFile(folderPath(name), title.fileName());
+        Q_EMIT changeFolderFile(folderPath(name), title.fileName());
     }
     setCurrentFolderName(name);
     if (mKeepDialog) {
@@ -294,7 +294,7 @@ void FolderPicker::openFolder()
     if (KSInputContext* context = KSInputContext::instance(); context && parentWidget())
         context->setWindowID(parentWidget()->winId());
     done(Accepted);
-    emit clearUndoCommandStack();
+    Q_EMIT clearUndoCommandStack();
 }
 
 void FolderPicker::cancelFolder()
@@ -302,7 +302,7 @@ void FolderPicker::cancelFolder()
     logTap(L"Tap Cancel Button");
     cancelEdit();
     done(Rejected);
-    emit signalCancelClicked();
+    Q_EMIT signalCancelClicked();
 }
 
 // --- The editor -----------------------------------------------------------------------------------------
@@ -316,7 +316,7 @@ bool FolderPicker::openEditor(const QModelIndex& index, FolderEdit action)
     mEditIndex = index;
     mFullName = mOldName;
     mTree->setCurrentIndex(index);
-    emit mTree->editorEvent(index);
+    Q_EMIT mTree->editorEvent(index);
     if (!mEditor) { // the tree refused
         slotEditStateEnd();
         return false;

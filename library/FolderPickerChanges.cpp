@@ -67,9 +67,9 @@ void FolderPicker::folderNameChanged(FileManagerDefine::tagChangeFolderNameParam
     regetRootPath();
     if (isNameOf(before, mCurrentFolderName)) {
         mCurrentFolderName = after;
-        emit folderNameChange(folderPath(before), folderPath(after));
+        Q_EMIT folderNameChange(folderPath(before), folderPath(after));
         // The steps back speak of the old path, also that of a text that was just being typed.
-        emit clearUndoCommandStack();
+        Q_EMIT clearUndoCommandStack();
     }
     if (!isVisible())
         return;

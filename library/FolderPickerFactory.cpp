@@ -52,7 +52,7 @@ QWidget* FolderPickerFactory::createControl(QWidget* parent, _controlType, const
         return nullptr;
     auto* editor = new FolderEditor(parent);
     mEditor = editor;
-    emit signalCreateEditor(editor);
+    Q_EMIT signalCreateEditor(editor);
     return editor;
 }
 

@@ -60,10 +60,10 @@ public:
     // All attributes of a folder's row. The name is what the row shows, whatever the disk says.
     void setFolderAttribute(KSModelAttributeItem* item, const QString& name, const QFileInfo& info) const;
 
-signals:
+Q_SIGNALS:
     void signalCreateEditor(FolderEditor* editor);
 
-public slots:
+public Q_SLOTS:
     void slotReleaseEditor();
 
 private:

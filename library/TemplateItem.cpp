@@ -38,7 +38,7 @@ void TemplateItem::setSelectedStyle()
 void TemplateItem::clickTriggered()
 {
     setSelectedStyle();
-    emit itemSelected(mIndex, this);
+    Q_EMIT itemSelected(mIndex, this);
 }
 
 void TemplateItem::showMenu()

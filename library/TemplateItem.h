@@ -35,7 +35,7 @@ public:
     // Opens the option menu beside a user template; does nothing for a preset.
     void showMenu();
 
-signals:
+Q_SIGNALS:
     void itemSelected(int index, TemplateItem* item);
 
 protected:

@@ -84,13 +84,13 @@ public:
     TemplateTab* presetTab() const { return mPresetTab; }
     TemplateTab* userTab() const { return mUserTab; }
 
-signals:
+Q_SIGNALS:
     // The record stays the picker's and is valid during the call.
     void selectedTemplate(Archive* archive);
     // A question is about to be shown over the soft keyboard.
     void signalCloseSoftwareKeyBoardForFileManager();
 
-public slots:
+public Q_SLOTS:
     // What happened to template folders: saved by the list, or reported by the file manager. Names are those
     // of folders. A path is that of a folder or of any file in it, and serves as the name of an import as
     // well. A rename or delete of what is no template is logged and changes nothing.

@@ -140,13 +140,13 @@ void TemplatePicker::take(TemplateTab& tab)
     if (!archive)
         return;
     mSelectedItem = true;
-    emit selectedTemplate(archive);
+    Q_EMIT selectedTemplate(archive);
     accept();
 }
 
 void TemplatePicker::deleteClicked2()
 {
-    emit signalCloseSoftwareKeyBoardForFileManager();
+    Q_EMIT signalCloseSoftwareKeyBoardForFileManager();
     const Archive* archive = mUserTab->selectedArchive();
     MessageBoxController* messages = MessageBoxController::getInstance();
     if (!archive || !messages)

@@ -197,7 +197,7 @@ void TemplateScrollArea::onTranslateTouchEventToMouse(QObject* watched, QTouchEv
         return;
     viewport()->releaseMouse();
     if (mPressedButton && !mMoved)
-        emit itemPressed(mPressedButton);
+        Q_EMIT itemPressed(mPressedButton);
 }
 
 void TemplateScrollArea::sendPressToViewport(const QPoint& global)

@@ -32,7 +32,7 @@ public:
     // For a button that is taken out of the grid: a finger on it gets no further.
     void letGoOf(TouchEventButton* button);
 
-signals:
+Q_SIGNALS:
     // A tap on a button; not after a drag.
     void itemPressed(QPushButton* button);
 

@@ -51,7 +51,7 @@ void TemplateTab::setTemplates(const QVector<Archive*>& templates)
         }
         mArchives.push_back(std::move(archive));
     }
-    emit selectionChanged();
+    Q_EMIT selectionChanged();
 }
 
 void TemplateTab::clear()
@@ -110,7 +110,7 @@ void TemplateTab::removeTemplate(int id)
     }
     mArchives.erase(mArchives.begin() + id);
     if (wasSelected)
-        emit selectionChanged();
+        Q_EMIT selectionChanged();
 }
 
 TemplateItem* TemplateTab::item(int id) const
@@ -151,7 +151,7 @@ void TemplateTab::select(TemplateItem* item)
         item->setSelectedStyle();
         saveSelection();
     }
-    emit selectionChanged();
+    Q_EMIT selectionChanged();
 }
 
 void TemplateTab::saveSelection()

@@ -64,14 +64,14 @@ public:
     void scrollToEnd();
     TemplateScrollArea* scrollArea() const { return mScrollArea; }
 
-signals:
+Q_SIGNALS:
     // A finger or the mouse has chosen an item.
     void itemSelected(int index, TemplateItem* item);
     void itemPressed(QPushButton* button);
     // Another template is chosen now, or none.
     void selectionChanged();
 
-private slots:
+private Q_SLOTS:
     void setBottomOnSliderAtOnce(int minimum, int maximum);
 
 private:

@@ -143,7 +143,7 @@ QImage ThumbnailRender::renderMiddleSizeCanvasScene()
 
 void ThumbnailRender::saveMiddleSizeThumnail(const Archive& archive, const QImage& image)
 {
-    emit saveHalfThumbnailsOK(
+    Q_EMIT saveHalfThumbnailsOK(
         QString::fromStdString(archive.getPath()),
         image.scaled(THUMBNAIL_SMALL_SIZE, Qt::IgnoreAspectRatio, Qt::SmoothTransformation));
 }

@@ -39,3 +39,6 @@ QPlatformInputContext* KSInputContextPlugin::create(const QString& key, const QS
     }
     return new KSInputContext(std::move(context));
 }
+
+// The plug-in's description is compiled here, where it is known that the plug-in is a part of the program.
+#include "moc_KSInputContextPlugin.cpp"

@@ -63,7 +63,7 @@ public:
     enum Ending { Close, CloseAfterQuestion, AnswerOfCreation, PowerOff, Signal };
     Q_ENUM(Ending)
 
-private slots:
+private Q_SLOTS:
     void initTestCase();
     void init();
     void cleanup();

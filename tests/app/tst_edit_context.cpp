@@ -12,7 +12,7 @@ class tst_edit_context : public QObject
 {
     Q_OBJECT
 
-private slots:
+private Q_SLOTS:
     void init()
     {
         EditContextController::clearInstance();

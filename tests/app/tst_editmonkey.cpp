@@ -78,7 +78,7 @@ class tst_editmonkey : public QObject
 {
     Q_OBJECT
 
-private slots:
+private Q_SLOTS:
     void initTestCase();
     void cleanupTestCase();
     void manyTouches();

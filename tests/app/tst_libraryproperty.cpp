@@ -107,7 +107,7 @@ class tst_LibraryProperty : public QObject
 {
     Q_OBJECT
 
-private slots:
+private Q_SLOTS:
     void initTestCase();
     void cleanupTestCase();
     void randomSession();
@@ -344,7 +344,7 @@ bool tst_LibraryProperty::leaveText(bool deleteBlank, const std::function<void()
 bool tst_LibraryProperty::choose(ArchiveAction::ARCHIVE_ACTION_TYPE type, int row)
 {
     if (!leaveText(true, [this, row] {
-            emit mList->widgetItemRightPressed(mList->archiveItem(row), QPoint(300, 60), mList);
+            Q_EMIT mList->widgetItemRightPressed(mList->archiveItem(row), QPoint(300, 60), mList);
         }))
         return false;
     CHECK(mList->IsOptionMenuShowing());
@@ -470,10 +470,10 @@ bool tst_LibraryProperty::moveTitle()
     mWindow->editAndDoneButtonClicked();
     CHECK(mWindow->archiveListIsMoveMode());
     ArchiveItem* item = mList->archiveItem(from);
-    emit mList->signalDragOneItem(item, from, mList);
+    Q_EMIT mList->signalDragOneItem(item, from, mList);
     mList->removeWidgetItem(item);
     mList->addWidgetItem(item, to);
-    emit mList->signalItemDrop();
+    Q_EMIT mList->signalItemDrop();
     mWindow->editAndDoneButtonClicked();
     CHECK(!mWindow->archiveListIsMoveMode());
     mModel.move(from, to);
@@ -490,7 +490,7 @@ bool tst_LibraryProperty::focusTitle()
     // The release over the list.
     if (!leaveText(false, [this] { mWindow->hideSoftWareWithOutDeleteEmptyItems(); }))
         return false;
-    emit mList->widgetItemReleased(mList->archiveItem(row), QPoint(300, 60), mList);
+    Q_EMIT mList->widgetItemReleased(mList->archiveItem(row), QPoint(300, 60), mList);
     mModel.focus(mModel.order.at(row));
     return takeCommands(0);
 }
@@ -585,9 +585,9 @@ bool tst_LibraryProperty::deleteText()
 bool tst_LibraryProperty::undoStep()
 {
     mDoing = "undo";
-    if (!leaveText(false, [this] { emit mBar->undoButtonClicked(); }))
+    if (!leaveText(false, [this] { Q_EMIT mBar->undoButtonClicked(); }))
         return false;
-    emit mBar->exeUndoAction();
+    Q_EMIT mBar->exeUndoAction();
     mModel.undo();
     return takeCommands(0);
 }
@@ -595,9 +595,9 @@ bool tst_LibraryProperty::undoStep()
 bool tst_LibraryProperty::redoStep()
 {
     mDoing = "redo";
-    if (!leaveText(false, [this] { emit mBar->redoButtonClicked(); }))
+    if (!leaveText(false, [this] { Q_EMIT mBar->redoButtonClicked(); }))
         return false;
-    emit mBar->exeRedoAction();
+    Q_EMIT mBar->exeRedoAction();
     mModel.redo();
     return takeCommands(0);
 }

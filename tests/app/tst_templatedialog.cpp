@@ -48,7 +48,7 @@ class tst_TemplateDialog : public QObject
 {
     Q_OBJECT
 
-private slots:
+private Q_SLOTS:
     void initTestCase();
     void cleanupTestCase();
     void init();
@@ -207,7 +207,7 @@ void tst_TemplateDialog::cancelMakesNoTitle()
         QTest::mouseClick(picker()->findChild<KSPushbutton*>("cancelTemplateButton"), Qt::LeftButton);
         QVERIFY(!picker()->isVisible());
     });
-    emit list()->startTemplatePicker();
+    Q_EMIT list()->startTemplatePicker();
     QCOMPARE(mOpened, 1);
     QVERIFY(!picker()->isSelectedItem());
     QCOMPARE(list()->count(), 2);
@@ -221,7 +221,7 @@ void tst_TemplateDialog::theChosenTemplateBecomesATitle()
         presets->select(presets->item(1));
         QTest::mouseClick(picker()->findChild<KSPushbutton*>("selectPresetButton"), Qt::LeftButton);
     });
-    emit list()->startTemplatePicker();
+    Q_EMIT list()->startTemplatePicker();
     QCOMPARE(mOpened, 1);
     QVERIFY(picker()->isSelectedItem());
     QCOMPARE(list()->count(), 3);
@@ -248,7 +248,7 @@ void tst_TemplateDialog::beginsWithTheOperatorsTemplates()
     auto* tabs = picker()->findChild<QTabWidget*>();
     tabs->setCurrentIndex(0);
     whenOpen([tabs] { QCOMPARE(tabs->currentIndex(), 1); });
-    emit list()->startUserTemplatePicker();
+    Q_EMIT list()->startUserTemplatePicker();
     QCOMPARE(mOpened, 1);
 }
 
@@ -309,7 +309,7 @@ void tst_TemplateDialog::aSavedTitleJoinsTheTemplates()
 {
     mFixture.makeUserTemplate("UserTemplate_009", {"saved text"});
     const qsizetype before = userNames().size();
-    emit list()->addUserSignal("UserTemplate_009");
+    Q_EMIT list()->addUserSignal("UserTemplate_009");
     QCOMPARE(userNames().size(), before + 1);
     QCOMPARE(userNames().last(), QString("UserTemplate_009"));
     QCOMPARE(mFixture.userOrder().last(), QString("UserTemplate_009"));

@@ -47,7 +47,7 @@ class tst_titler_window : public QObject
 {
     Q_OBJECT
 
-private slots:
+private Q_SLOTS:
     void initTestCase();
     void cleanupTestCase();
     void cleanup();
@@ -349,7 +349,7 @@ void tst_titler_window::moveModeEatsPressesOutsideTheList()
     QTest::mouseClick(move, Qt::LeftButton);
     QVERIFY(!mWindow->archiveListIsMoveMode());
     QTest::mouseClick(move, Qt::LeftButton);
-    emit TitlerAPPEventFilterController::getInstance()->signalRestoreOriginal();
+    Q_EMIT TitlerAPPEventFilterController::getInstance()->signalRestoreOriginal();
     QVERIFY(!mWindow->archiveListIsMoveMode());
 }
 

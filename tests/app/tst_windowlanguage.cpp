@@ -15,7 +15,7 @@ class tst_WindowLanguage : public QObject
 {
     Q_OBJECT
 
-private slots:
+private Q_SLOTS:
     void initTestCase();
     void cleanupTestCase();
     void missingTranslationLeavesTheLanguage();

@@ -101,7 +101,7 @@ class tst_windowmonkey : public QObject
 public:
     bool eventFilter(QObject* object, QEvent* event) override;
 
-private slots:
+private Q_SLOTS:
     void initTestCase();
     void cleanupTestCase();
     void manyTouches();

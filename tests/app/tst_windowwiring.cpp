@@ -28,7 +28,7 @@ class tst_WindowWiring : public QObject
 {
     Q_OBJECT
 
-private slots:
+private Q_SLOTS:
     void initTestCase();
     void cleanupTestCase();
     void aMissingRowIsNoticed();

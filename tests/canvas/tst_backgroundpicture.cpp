@@ -10,7 +10,7 @@ class tst_BackgroundPicture : public QObject
 {
     Q_OBJECT
 
-private slots:
+private Q_SLOTS:
     void itemsOfOneFileShareItsPicture();
     void copiesShareThePicture();
     void changedFileIsReadAnew();

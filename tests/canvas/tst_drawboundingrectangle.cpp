@@ -9,7 +9,7 @@ class tst_drawboundingrectangle : public QObject
 {
     Q_OBJECT
 
-private slots:
+private Q_SLOTS:
     void initTestCase();
     void piecesLieWhereTheyBelong();
     void cornersOnly();

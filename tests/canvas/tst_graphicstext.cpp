@@ -34,7 +34,7 @@ class tst_graphicstext : public QObject
 {
     Q_OBJECT
 
-private slots:
+private Q_SLOTS:
     void initTestCase() { qRegisterMetaType<TText*>("TText*"); }
     void init();
     void typeAndFlags();

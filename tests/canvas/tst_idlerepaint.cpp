@@ -45,7 +45,7 @@ class tst_idlerepaint : public QObject
 {
     Q_OBJECT
 
-private slots:
+private Q_SLOTS:
     void initTestCase();
     void init();
     void cleanup();

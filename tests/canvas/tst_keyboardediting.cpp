@@ -40,7 +40,7 @@ class tst_keyboardediting : public QObject
 {
     Q_OBJECT
 
-private slots:
+private Q_SLOTS:
     void initTestCase();
     void init();
     void cleanup();

@@ -12,7 +12,7 @@ class tst_picturesagree : public QObject
 {
     Q_OBJECT
 
-private slots:
+private Q_SLOTS:
     void init();
     void everyProperty_data();
     void everyProperty();

@@ -13,7 +13,7 @@ class tst_styledocument : public QObject
 {
     Q_OBJECT
 
-private slots:
+private Q_SLOTS:
     void init();
     void scriptClass_data();
     void scriptClass();

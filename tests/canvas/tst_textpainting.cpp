@@ -51,7 +51,7 @@ class tst_textpainting : public QObject
 {
     Q_OBJECT
 
-private slots:
+private Q_SLOTS:
     void init();
     void boundingRectIsCropped();
     void marginsFollowTheTallestLine();

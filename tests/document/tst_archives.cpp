@@ -44,7 +44,7 @@ class TestArchives : public QObject
 {
     Q_OBJECT
 
-private slots:
+private Q_SLOTS:
     void initTestCase()
     {
         qputenv("K2SYS_LOG_DIR", mLogs.path().toUtf8());

@@ -56,7 +56,7 @@ class TestKilledSaves : public QObject
 {
     Q_OBJECT
 
-private slots:
+private Q_SLOTS:
     void killedAtAnyMoment_data()
     {
         QTest::addColumn<QString>("mode");

@@ -44,7 +44,7 @@ class TestPictures : public QObject
 {
     Q_OBJECT
 
-private slots:
+private Q_SLOTS:
     void init()
     {
         mFolder = std::make_unique<QTemporaryDir>();

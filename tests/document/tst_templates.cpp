@@ -69,7 +69,7 @@ class TestTemplates : public QObject
 {
     Q_OBJECT
 
-private slots:
+private Q_SLOTS:
     void initTestCase()
     {
         qputenv("K2SYS_LOG_DIR", mLogs.path().toUtf8());

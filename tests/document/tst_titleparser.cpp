@@ -100,7 +100,7 @@ class TestTitleParser : public QObject
 {
     Q_OBJECT
 
-private slots:
+private Q_SLOTS:
     void init() { mFolder = std::make_unique<QTemporaryDir>(); }
 
     void cleanup() { QVERIFY(FileSyncQueue::flush(std::chrono::seconds(30))); }

@@ -33,7 +33,7 @@ class TestRecords : public QObject
 {
     Q_OBJECT
 
-private slots:
+private Q_SLOTS:
     void defaults()
     {
         const TText text;

@@ -10,7 +10,7 @@ class tst_fonts : public QObject
 {
     Q_OBJECT
 
-private slots:
+private Q_SLOTS:
     void family_data();
     void family();
     void applicationFontIsAnAliasOfKst();

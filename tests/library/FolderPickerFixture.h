@@ -192,7 +192,7 @@ public:
     {
         MessageDefine::tagCloseParam param;
         param.messageId = MessageDef::MESSAGE_RENAME_FAILED;
-        emit MessageBoxController::getInstance()->signalCloseMessage(param);
+        Q_EMIT MessageBoxController::getInstance()->signalCloseMessage(param);
     }
 
     LibraryFixture files;

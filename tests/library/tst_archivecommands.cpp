@@ -40,7 +40,7 @@ class tst_ArchiveCommands : public QObject
 {
     Q_OBJECT
 
-private slots:
+private Q_SLOTS:
     void init();
     void cleanup();
     void deleteOfTheSelectedTitle();

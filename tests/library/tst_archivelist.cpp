@@ -18,7 +18,7 @@ class tst_ArchiveList : public QObject
 {
     Q_OBJECT
 
-private slots:
+private Q_SLOTS:
     void init();
     void cleanup();
     void opensAFolderInItsOrder();

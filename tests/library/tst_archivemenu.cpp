@@ -63,7 +63,7 @@ class tst_ArchiveMenu : public QObject
 {
     Q_OBJECT
 
-private slots:
+private Q_SLOTS:
     void initTestCase();
     void cleanupTestCase();
     void init();
@@ -138,7 +138,7 @@ void tst_ArchiveMenu::siblingsHearOfTheMenuOnce_data()
     QTest::newRow("a press outside") << Closing([this] { m->tapTitle(5); });
     QTest::newRow("a key") << Closing([this] { QTest::keyClick(m->menu(), Qt::Key_Escape); });
     QTest::newRow("a sibling that asks to give way")
-        << Closing([this] { emit mEvents->signalRestoreOriginal(); });
+        << Closing([this] { Q_EMIT mEvents->signalRestoreOriginal(); });
     QTest::newRow("the window that closes") << Closing([this] { m->list->slotHideOptionMenu(); });
     QTest::newRow("a turn of the wheel") << Closing([this] {
         QWheelEvent event(QPointF(100, 100), m->list->mapToGlobal(QPointF(100, 100)), QPoint(),
@@ -168,7 +168,7 @@ void tst_ArchiveMenu::requestToGiveWayWithoutAMenuIsNothing()
     m->hold(List::PICTURE_X, 60);
     m->list->slotHideOptionMenu();
     mEvents->take();
-    emit mEvents->signalRestoreOriginal();
+    Q_EMIT mEvents->signalRestoreOriginal();
     m->list->slotHideOptionMenu();
     QCOMPARE(mEvents->take(), Events());
     // Without a link the menu is this process' own.

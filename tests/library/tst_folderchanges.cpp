@@ -9,7 +9,7 @@ class TestFolderChanges : public QObject
 {
     Q_OBJECT
 
-private slots:
+private Q_SLOTS:
     void initTestCase()
     {
         Q_INIT_RESOURCE(UILibrary);

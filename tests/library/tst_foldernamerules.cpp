@@ -49,7 +49,7 @@ class TestFolderNameRules : public QObject
 {
     Q_OBJECT
 
-private slots:
+private Q_SLOTS:
     void init()
     {
         QDir(mFixture.titleRoot()).removeRecursively();

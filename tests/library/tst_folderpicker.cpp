@@ -7,7 +7,7 @@ class TestFolderPicker : public QObject
 {
     Q_OBJECT
 
-private slots:
+private Q_SLOTS:
     void initTestCase()
     {
         Q_INIT_RESOURCE(UILibrary);
@@ -586,7 +586,7 @@ private slots:
         // The answer to another box is none to this one.
         MessageDefine::tagCloseParam other;
         other.messageId = MessageDef::MESSAGE_CONFIRM_CLOSE;
-        emit f.messages.signalCloseMessage(other);
+        Q_EMIT f.messages.signalCloseMessage(other);
         f.tap("sports");
         QCOMPARE(f.picker->editor(), editor);
         f.service->calls.clear();

@@ -49,7 +49,7 @@ class TestFolderTaps : public QObject
 public:
     explicit TestFolderTaps(LogFixture& log) : mLog(log) {}
 
-private slots:
+private Q_SLOTS:
     void initTestCase()
     {
         Q_INIT_RESOURCE(UILibrary);

@@ -14,7 +14,7 @@ class tst_LibraryThreads : public QObject
 {
     Q_OBJECT
 
-private slots:
+private Q_SLOTS:
     void loaderHandsItsTitlesOver();
     void loaderKeepsWhatNobodyTakes();
     void loaderOfAMissingFolderGivesNothing();

@@ -19,7 +19,7 @@ class tst_ListAndCanvas : public QObject
 {
     Q_OBJECT
 
-private slots:
+private Q_SLOTS:
     void init();
     void cleanup();
     void selectedTitleIsOnTheCanvas();

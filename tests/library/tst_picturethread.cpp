@@ -32,7 +32,7 @@ class tst_PictureThread : public QObject
 {
     Q_OBJECT
 
-private slots:
+private Q_SLOTS:
     void finishedStates();
     void refusedJobs();
     void filesAndSizes();

@@ -10,7 +10,7 @@ class tst_SmallPictures : public QObject
 {
     Q_OBJECT
 
-private slots:
+private Q_SLOTS:
     void eachPictureComesAtItsPlace();
     void takenBeforeItsTurn();
     void whatIsNoPictureIsNull();

@@ -34,7 +34,7 @@ class tst_TemplateNotices : public QObject
 {
     Q_OBJECT
 
-private slots:
+private Q_SLOTS:
     void initTestCase() { Q_INIT_RESOURCE(TitlerToolResource); }
     void init();
     void cleanup() { mPicker.reset(); }

@@ -23,7 +23,7 @@ class TestTemplatePicker : public QObject
 {
     Q_OBJECT
 
-private slots:
+private Q_SLOTS:
     void initTestCase() { Q_INIT_RESOURCE(TitlerToolResource); }
 
     void init()
@@ -705,7 +705,7 @@ private:
 
     void answer(MessageDefine::_emCloseType type, int id = 43)
     {
-        emit mMessages.signalCloseMessage({1, type, id});
+        Q_EMIT mMessages.signalCloseMessage({1, type, id});
     }
 
     void verifyDense()

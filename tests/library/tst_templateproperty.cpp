@@ -34,7 +34,7 @@ class tst_TemplateProperty : public QObject
 {
     Q_OBJECT
 
-private slots:
+private Q_SLOTS:
     void initTestCase();
     void randomOrder();
 
@@ -244,14 +244,14 @@ void tst_TemplateProperty::deleteByQuestion()
     const int kind = random(4);
     if (kind == 0) {
         mDoing += " and answer another question first";
-        emit mMessages.signalCloseMessage({1, MessageDefine::CLOSE_OK, 109});
+        Q_EMIT mMessages.signalCloseMessage({1, MessageDefine::CLOSE_OK, 109});
     }
     if (kind == 1) {
         mDoing += " and keep it";
-        emit mMessages.signalCloseMessage({1, MessageDefine::CLOSE_CANCEL, 43});
+        Q_EMIT mMessages.signalCloseMessage({1, MessageDefine::CLOSE_CANCEL, 43});
         return;
     }
-    emit mMessages.signalCloseMessage({1, MessageDefine::CLOSE_OK, 43});
+    Q_EMIT mMessages.signalCloseMessage({1, MessageDefine::CLOSE_OK, 43});
     if (!mChosen.isEmpty()) {
         QVERIFY(!QFileInfo::exists(folderOf(mChosen)));
         forget(QString(mChosen));

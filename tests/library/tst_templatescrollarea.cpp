@@ -22,7 +22,7 @@ class TestTemplateScrollArea : public QObject
 {
     Q_OBJECT
 
-private slots:
+private Q_SLOTS:
     void init()
     {
         mArea = std::make_unique<TemplateScrollArea>();

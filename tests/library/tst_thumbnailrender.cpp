@@ -33,7 +33,7 @@ class tst_ThumbnailRender : public QObject
 {
     Q_OBJECT
 
-private slots:
+private Q_SLOTS:
     void nullDoesNothing();
     void fastStageTouchesNoDisk();
     void fastStageWithoutBackgroundIsTransparent();

@@ -52,7 +52,7 @@ class tst_TitleFileOperations : public QObject
 {
     Q_OBJECT
 
-private slots:
+private Q_SLOTS:
     void thumbnailNames();
     void freeStemSkipsTakenNames();
     void emptyFolderMakesNothing();

@@ -175,7 +175,7 @@ class TestAppliance : public QObject
 {
     Q_OBJECT
 
-private slots:
+private Q_SLOTS:
     void initTestCase() { TestPorts::useFreeOffset(); }
     void init();
     void cleanup();

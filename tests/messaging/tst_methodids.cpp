@@ -146,7 +146,7 @@ class TestMethodIds : public QObject
 {
     Q_OBJECT
 
-private slots:
+private Q_SLOTS:
     void ids_data()
     {
         QTest::addColumn<long>("id");

@@ -90,7 +90,7 @@ class TestObjectModel : public QObject
 {
     Q_OBJECT
 
-private slots:
+private Q_SLOTS:
     void receiverLooksInTheRightMap();
     void receiverKeepsTheFirstOfAnId();
     void receiverOwnsItsAdapters();

@@ -65,7 +65,7 @@ class TestPacking : public QObject
 {
     Q_OBJECT
 
-private slots:
+private Q_SLOTS:
     void init();
     void intsTakeTheSmallestForm_data();
     void intsTakeTheSmallestForm();

@@ -214,7 +214,7 @@ class TestServices : public QObject, private PTC::IAdapterFactory, private PTC::
 {
     Q_OBJECT
 
-private slots:
+private Q_SLOTS:
     void init();
     void cleanup();
     void appEventFilter();

@@ -116,7 +116,7 @@ class TestRecords : public QObject
 {
     Q_OBJECT
 
-private slots:
+private Q_SLOTS:
     void initTestCase() { m_cases = makeCases(); }
     void thereAndBack();
     void fieldsArriveInTheirPlaces();

@@ -79,7 +79,7 @@ class tst_titlerprovision : public QObject
 {
     Q_OBJECT
 
-private slots:
+private Q_SLOTS:
     void initTestCase();
     void thePathFileHasEveryNode();
     void checkersHaveTwoShades();

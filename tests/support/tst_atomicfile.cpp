@@ -30,7 +30,7 @@ class TestAtomicFile : public QObject
 {
     Q_OBJECT
 
-private slots:
+private Q_SLOTS:
     void init() { mFolder = std::make_unique<QTemporaryDir>(); }
 
     void cleanup()

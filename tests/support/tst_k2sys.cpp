@@ -14,7 +14,7 @@ class TestK2sys : public QObject
 {
     Q_OBJECT
 
-private slots:
+private Q_SLOTS:
     void init();
     void root();
     void data();

@@ -47,7 +47,7 @@ class TestLogging : public QObject
 {
     Q_OBJECT
 
-private slots:
+private Q_SLOTS:
     void init();
     void cleanup();
     void operationLine();

@@ -18,7 +18,7 @@ class TestPathManager : public QObject
 {
     Q_OBJECT
 
-private slots:
+private Q_SLOTS:
     void init()
     {
         mFolder = std::make_unique<QTemporaryDir>();

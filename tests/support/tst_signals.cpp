@@ -8,7 +8,7 @@ class TestSignals : public QObject
 {
     Q_OBJECT
 
-private slots:
+private Q_SLOTS:
     void terminationCallsBack_data();
     void terminationCallsBack();
     void withoutAnEventLoopTheHandlerCallsBack();

@@ -67,7 +67,7 @@ class TestXmlFile : public QObject
 {
     Q_OBJECT
 
-private slots:
+private Q_SLOTS:
     void initTestCase() { QVERIFY(mFolder.isValid()); }
 
     void limits_data()
