@@ -18,6 +18,8 @@ import zlib
 
 ROOT = os.path.dirname(os.path.dirname(os.path.abspath(__file__)))
 WIDTH, HEIGHT = 1920, 1080
+# The screen is still when this many looks at it, one after another, found nothing that moved or worked.
+LOOKS_WHEN_STILL = 5
 TITLER_PORT = 1003
 MAIN_PORT = 1000
 SUB_PANEL_PORT = 1002
@@ -83,6 +85,19 @@ class Process:
     def running(self):
         return self.popen.poll() is None
 
+    def works(self):
+        """Whether a thread of the process runs, or would if a processor were free for it, at this moment. A process that
+        has events left to handle is never found asleep, however long it waits for its turn on a busy machine."""
+        folder = f"/proc/{self.pid}/task"
+        try:
+            for thread in os.listdir(folder):
+                with open(f"{folder}/{thread}/stat", encoding="utf-8", errors="replace") as stream:
+                    if stream.read().rpartition(")")[2].split()[0] == "R":
+                        return True
+        except OSError:
+            pass  # it has ended, or a thread has
+        return False
+
     def signal(self, number):
         if self.running():
             self.killed = self.killed or number == signal.SIGKILL
@@ -120,6 +135,7 @@ class Display:
                               pass_fds=[write_end])
         os.close(write_end)
         self.manager = None
+        self.watched = [self.server]
         try:
             with os.fdopen(read_end) as stream:
                 number = stream.readline().strip()
@@ -144,6 +160,7 @@ class Display:
             os.remove(mark)
         self.manager = Process(["openbox", "--sm-disable", "--startup", shlex.join(["touch", mark])],
                                os.path.join(self.folder, "openbox.log"), self.environment)
+        self.watch(self.manager)
 
         def has_started():
             self.manager.check()
@@ -220,17 +237,24 @@ class Display:
     def screenshot(self, path):
         write_png(path, *self.grab())
 
-    def wait_until_still(self, timeout=15, quiet=0.3):
-        """Waits until the screen has not changed for quiet seconds."""
+    def watch(self, process):
+        """Takes a process that has to do with what the display shows: while it works the screen is not still."""
+        self.watched.append(process)
+
+    def wait_until_still(self, timeout=60, quiet=0.3):
+        """Waits until the screen has not changed for quiet seconds and no process behind it has worked at any look. On a
+        busy machine a program may take longer than that to get a processor at all."""
         deadline = time.monotonic() + timeout
-        last, since = self.grab()[2], time.monotonic()
-        while time.monotonic() - since < quiet:
+        last, since, looks = self.grab()[2], time.monotonic(), 0
+        while looks < LOOKS_WHEN_STILL or time.monotonic() - since < quiet:
             if time.monotonic() > deadline:
                 raise SessionError(f"the screen still changes after {timeout} s")
-            time.sleep(0.05)
+            time.sleep(0.03)
+            works = any(process.works() for process in self.watched)
             now = self.grab()[2]
-            if now != last:
-                last, since = now, time.monotonic()
+            looks += 1
+            if works or now != last:
+                last, since, looks = now, time.monotonic(), 0
 
 
 def write_png(path, width, height, rgb):

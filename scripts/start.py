@@ -82,6 +82,8 @@ def start(build, folder, environment, title, display):
             titler.check()
             return display.find_window("Titler")
 
+        display.watch(appliance)
+        display.watch(titler)
         session.wait_until(shown, 30, "the titler's window")
         display.wait_until_still()
     return appliance, titler

@@ -157,6 +157,7 @@ class TitlerTest(unittest.TestCase):
         self.appliance = session.Appliance(BUILD, os.path.join(self.keep, "appliance.log"), self.environment)
         self.addCleanup(self.appliance.stop)
         self.programs.append(self.appliance)
+        self.display.watch(self.appliance)
         session.wait_listening(self.appliance, session.MAIN_PORT + self.offset, 30 * SLOW)
         session.wait_listening(self.appliance, session.SUB_PANEL_PORT + self.offset, 30 * SLOW)
         self.start_titler()
@@ -167,6 +168,7 @@ class TitlerTest(unittest.TestCase):
                                            self.titler_arguments)
         self.addCleanup(self.titler.stop)
         self.programs.append(self.titler)
+        self.display.watch(self.titler)
         session.wait_listening(self.titler, session.TITLER_PORT + self.offset, 60 * SLOW)
         self.command("wait-titler")
         # The last service that a titler registers at: from here on every notice reaches it.

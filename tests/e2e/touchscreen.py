@@ -100,13 +100,18 @@ class TouchDevice:
         if struct.unpack("<IIHH", self.socket.recv(64))[2] != PROTOCOL[0]:
             raise session.SessionError("the touch device speaks another version")
 
-    def send(self, kind, finger, x, y):
+    @staticmethod
+    def _packet(kind, finger, x, y):
         body = struct.pack("<II", finger, kind) + valuators({
             AXIS_X: x * AXIS_MAXIMUM / (session.WIDTH - 1), AXIS_Y: y * AXIS_MAXIMUM / (session.HEIGHT - 1),
             AXIS_PRESSURE: PRESSURE})
-        self.socket.sendall(struct.pack("<II", 8 + len(body), TOUCH) + body)
-        # Comes back when the server has taken the event.
-        self.socket.sendall(struct.pack("<II", 8, WAIT_FOR_SYNC))
+        return struct.pack("<II", 8 + len(body), TOUCH) + body
+
+    def send(self, *events):
+        """Sends events, each a kind, a finger and a place. They follow one another at once, however busy the machine is:
+        this process may be kept waiting before or after them, but not between them."""
+        sync = struct.pack("<II", 8, WAIT_FOR_SYNC)  # comes back when the server has taken the events
+        self.socket.sendall(b"".join(self._packet(*event) for event in events) + sync)
         self.socket.recv(64)
 
 
@@ -194,13 +199,13 @@ class TouchDisplay(session.Display):
 
     def down(self, x, y, finger=0):
         self.touching[finger] = (x, y)
-        self.device.send(TOUCH_BEGIN, finger, x, y)
+        self.device.send((TOUCH_BEGIN, finger, x, y))
 
     def move(self, x, y, finger=0):
-        self.device.send(TOUCH_UPDATE, finger, x, y)
+        self.device.send((TOUCH_UPDATE, finger, x, y))
 
     def up(self, x, y, finger=0):
-        self.device.send(TOUCH_END, finger, x, y)
+        self.device.send((TOUCH_END, finger, x, y))
         self.touching.pop(finger, None)
 
     def lift_all(self):
@@ -209,13 +214,16 @@ class TouchDisplay(session.Display):
             self.up(*place, finger)
 
     def tap(self, x, y, finger=0):
-        self.down(x, y, finger)
-        self.up(x, y, finger)
+        """Puts a finger down and lifts it, too quickly to be taken for one that stays."""
+        self.device.send((TOUCH_BEGIN, finger, x, y), (TOUCH_END, finger, x, y))
 
     def drag(self, start, end, steps=12, finger=0):
-        """Puts a finger down, moves it in a straight line and lifts it."""
-        self.down(*start, finger)
-        for step in range(1, steps + 1):
-            self.move(start[0] + (end[0] - start[0]) * step / steps, start[1] + (end[1] - start[1]) * step / steps,
-                      finger)
+        """Puts a finger down, moves it in a straight line without a stop at its beginning, and lifts it."""
+        places = [tuple(a + (b - a) * step / steps for a, b in zip(start, end)) for step in range(1, steps + 1)]
+        self.touching[finger] = start
+        # What comes in one go may reach the program as a single move, so only the beginning does.
+        away = (steps + 3) // 4
+        self.device.send((TOUCH_BEGIN, finger, *start), *((TOUCH_UPDATE, finger, *place) for place in places[:away]))
+        for place in places[away:]:
+            self.move(*place, finger)
         self.up(*end, finger)
