@@ -31,7 +31,9 @@ constexpr double BUILD_AIM = 2.0;
 constexpr double TAP_AIM = 1.5;
 constexpr double OPEN_AIM = 1.5;
 constexpr double FIRST_SCREEN_AIM = 0.15;
+constexpr double LONG_FIRST_SCREEN_AIM = 1.5;
 constexpr int TITLES = 99;
+constexpr int LONG_TITLES = 998;
 constexpr int TICK_PIXELS = 24; // of a brisk flick
 constexpr int CHARACTERS = 100;
 
@@ -40,6 +42,16 @@ QString titleFolder(const BenchEnvironment& environment)
     static const QString folder = [&environment] {
         const QString path = environment.makeFolder(QStringLiteral("list"));
         BenchTitles::writeIllustratedFolder(path.toStdString(), TITLES);
+        return path;
+    }();
+    return folder;
+}
+
+QString longFolder(const BenchEnvironment& environment)
+{
+    static const QString folder = [&environment] {
+        const QString path = environment.makeFolder(QStringLiteral("long"));
+        BenchTitles::writeIllustratedFolder(path.toStdString(), LONG_TITLES);
         return path;
     }();
     return folder;
@@ -64,6 +76,7 @@ void flickList(benchmark::State& state, const QString& folder)
 {
     ShownList shown;
     shown.open(folder);
+    shown.completeAll();
     QScrollBar& bar = *shown.list.verticalScrollBar();
     int value = 0;
     int step = TICK_PIXELS;
@@ -80,6 +93,7 @@ void scrollBareArea(benchmark::State& state, const QString& folder)
 {
     ShownList shown;
     shown.open(folder);
+    shown.completeAll();
     QScrollArea area;
     area.setFrameShape(QFrame::NoFrame);
     area.setHorizontalScrollBarPolicy(Qt::ScrollBarAlwaysOff);
@@ -199,44 +213,25 @@ void renderTitle(benchmark::State& state, const BenchEnvironment& environment)
     }
 }
 
-// Stops the clock when the first screen of thumbnails is painted.
+// Sees when the first screen of thumbnails is painted.
 class FirstScreen : public QObject
 {
 public:
-    FirstScreen(benchmark::State& state, ArchiveList& list) : mState(state), mList(list)
-    {
-        list.viewport()->installEventFilter(this);
-        list.installEventFilter(this);
-    }
+    explicit FirstScreen(ArchiveList& list) : mList(list) { list.viewport()->installEventFilter(this); }
     bool isPainting() const { return mIsPainting; }
-    bool isPainted() const { return mIsPainted; }
-    void begin()
-    {
-        mIsPainting = false;
-        mIsPainted = false;
-    }
-    void end()
-    {
-        if (!mIsPainted)
-            mState.PauseTiming();
-        mIsPainted = true;
-    }
+    void begin() { mIsPainting = false; }
 
     bool eventFilter(QObject* object, QEvent* event) override
     {
         const ArchiveItem* last = mList.archiveItem(mList.lastVisibleItem());
         if (object == mList.viewport() && event->type() == QEvent::Paint)
             mIsPainting = last && last->hasChildWidgets();
-        else if (mIsPainting && event->type() == QEvent::MetaCall) // the next title's turn
-            end();
         return false;
     }
 
 private:
-    benchmark::State& mState;
     ArchiveList& mList;
     bool mIsPainting = false;
-    bool mIsPainted = false;
 };
 
 void closeFolder(ShownList& shown)
@@ -250,6 +245,7 @@ void openFolder(benchmark::State& state, const QString& folder)
     ShownList shown;
     for ([[maybe_unused]] auto _ : state) {
         shown.open(folder);
+        shown.completeAll();
         state.PauseTiming();
         if (shown.list.count() != TITLES)
             state.SkipWithError("the folder was not opened");
@@ -261,13 +257,13 @@ void openFolder(benchmark::State& state, const QString& folder)
 void openFirstScreen(benchmark::State& state, const QString& folder)
 {
     ShownList shown;
-    FirstScreen first(state, shown.list);
+    FirstScreen first(shown.list);
     for ([[maybe_unused]] auto _ : state) {
         first.begin();
         shown.list.refreshArchiveList(folder);
         while (!first.isPainting())
             QCoreApplication::processEvents();
-        first.end();
+        state.PauseTiming();
         closeFolder(shown);
         state.ResumeTiming();
     }
@@ -303,4 +299,8 @@ void Topics::addList(PairList& list, const BenchEnvironment& environment)
         {"folder_first_screen", FIRST_SCREEN_AIM, PairList::Clock::Wall}, benchmark::kMillisecond,
         [place](benchmark::State& state) { openFirstScreen(state, titleFolder(*place)); },
         [place](benchmark::State& state) { openFolder(state, titleFolder(*place)); });
+    list.add(
+        {"long_folder_first_screen", LONG_FIRST_SCREEN_AIM, PairList::Clock::Wall}, benchmark::kMillisecond,
+        [place](benchmark::State& state) { openFirstScreen(state, longFolder(*place)); },
+        [place](benchmark::State& state) { openFirstScreen(state, titleFolder(*place)); });
 }

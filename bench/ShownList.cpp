@@ -21,6 +21,15 @@ ShownList::ShownList() : list(&mLabel, false)
 void ShownList::open(const QString& folder)
 {
     list.refreshArchiveList(folder);
+    while (list.count() > 0 && !list.archiveItem(list.lastVisibleItem())->hasChildWidgets())
+        show(list);
+    show(list);
+}
+
+void ShownList::completeAll()
+{
+    for (int i = 0; i < list.count(); ++i)
+        list.archiveItem(i);
     while (list.count() > 0 && !list.archiveItem(list.count() - 1)->hasChildWidgets())
         show(list);
     show(list);

@@ -4,6 +4,7 @@
 #include "document/ArchiveManager.h"
 #include "document/ArchiveOrder.h"
 #include "document/DocumentConstants.h"
+#include "document/FolderTitles.h"
 #include "document/ITitleChangeReporter.h"
 #include "support/LogManager.h"
 #include "support/SystemInfo.h"
@@ -20,7 +21,6 @@ namespace
 
 constexpr std::string_view USER_TEMPLATE_PREFIX = "UserTemplate_";
 constexpr std::size_t NUMBER_LENGTH = 3;
-constexpr std::size_t XML_EXTENSION_LENGTH = 4;
 constexpr int LARGEST_NUMBER = 999;
 constexpr std::size_t MOST_NUMBERS = 997;
 
@@ -77,20 +77,11 @@ QList<std::string> ArchiveController::getFolderList()
 // them: what the list does not show, the clean-up deletes.
 QList<Archive*> ArchiveController::readableArchives(const std::string& folder)
 {
-    const std::vector<ArchiveOrder*> rows = mArchiveManager->getArchivesSortUnderFolder(folder);
-    const std::vector<std::unique_ptr<ArchiveOrder>> owner(rows.begin(), rows.end());
+    const FolderTitles rows(folder);
     QList<Archive*> titles;
-    for (std::size_t k = 0; k < rows.size(); ++k) {
-        auto archive = std::make_unique<Archive>();
-        const std::string& name = rows[k]->getArchivePath();
-        if (!name.empty()) {
-            if (name.size() < XML_EXTENSION_LENGTH ||
-                mArchiveManager->loadArchive(folder + STR_SLASH + name, archive.get()) < 1)
-                continue;
-            archive->setName(name.substr(0, name.size() - XML_EXTENSION_LENGTH));
-            archive->setOrder(std::to_string(k + 1));
-        }
-        titles.append(archive.release());
+    for (std::unique_ptr<Archive>& title : rows.read(0, rows.count())) {
+        if (title)
+            titles.append(title.release());
     }
     return titles;
 }

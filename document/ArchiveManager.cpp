@@ -141,7 +141,7 @@ int ArchiveManager::loadArchive(std::string path, Archive* archive)
 int ArchiveManager::deleteArchive(std::string path)
 {
     Archive archive;
-    if (loadArchive(path, &archive) < 1)
+    if (TitleParser().readOneTitle(path, &archive) < 1) // its place in the order does not matter
         return 0;
     const bool isRemoved = std::remove(path.c_str()) == 0;
     const std::string folder = path.substr(0, path.rfind('/') + 1);

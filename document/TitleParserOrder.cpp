@@ -2,46 +2,23 @@
 #include "document/Archive.h"
 #include "document/ArchiveOrder.h"
 #include "document/DocumentConstants.h"
+#include "document/FolderTitles.h"
 #include "document/TitleParser.h"
 #include "document/TitleParserUtility.h"
 #include "support/XmlFile.h"
 
-#include <algorithm>
-#include <atomic>
 #include <cstdio>
-#include <future>
 #include <memory>
-#include <thread>
+#include <stdexcept>
 #include <tinyxml.h>
 
 namespace
 {
 
-constexpr std::size_t EXTENSION_LENGTH = 4; // of ".xml"
-
 // An int attribute as TinyXML reads it: leading blanks and what follows the number do not matter.
 bool readInt(const TiXmlElement& element, const char* key, int& value)
 {
     return element.QueryIntAttribute(key, &value) == TIXML_SUCCESS;
-}
-
-// Calls job(0) to job(count - 1), each once, and returns when all are done. The calling thread takes part.
-template <typename Job>
-void onAllCores(std::size_t count, const Job& job)
-{
-    constexpr std::size_t WORTH_A_THREAD = 8;
-    std::atomic<std::size_t> next = 0;
-    const auto work = [&] {
-        for (std::size_t k = next++; k < count; k = next++)
-            job(k);
-    };
-    const std::size_t cores = std::max(std::thread::hardware_concurrency(), 1U);
-    std::vector<std::future<void>> helpers;
-    for (std::size_t i = 1; i < std::min(cores, count / WORTH_A_THREAD); ++i)
-        helpers.push_back(std::async(std::launch::async, work));
-    work();
-    for (std::future<void>& helper : helpers)
-        helper.get();
 }
 
 } // namespace
@@ -93,30 +70,13 @@ int TitleParser::writeFileOrderInFolder(std::string folder, std::vector<ArchiveO
 
 std::vector<Archive*> TitleParser::getFilsByOrderInFolder(std::string folder)
 {
-    const std::vector<ArchiveOrder*> rows = readFileOrderInFolder(folder);
-    std::vector<std::unique_ptr<ArchiveOrder>> owner(rows.begin(), rows.end());
-    std::vector<std::unique_ptr<Archive>> titles;
-    for (std::size_t k = 0; k < rows.size(); ++k) {
-        auto archive = std::make_unique<Archive>();
-        const std::string& path = rows[k]->getArchivePath();
-        if (!path.empty()) {
-            // Throws std::out_of_range for a name that cannot be that of a title file.
-            std::string name = path;
-            name.erase(name.size() - EXTENSION_LENGTH);
-            archive->setName(std::move(name));
-            archive->setOrder(std::to_string(k + 1));
-        }
-        titles.push_back(std::move(archive));
+    const FolderTitles titles(std::move(folder));
+    for (std::size_t row = 0; row < titles.count(); ++row) {
+        if (!titles.canBeTitle(row))
+            throw std::out_of_range("a row too short for the name of a title file");
     }
-    // Each is read on its own; a row without a path makes an empty title.
-    onAllCores(titles.size(), [&](std::size_t k) {
-        const std::string& path = rows[k]->getArchivePath();
-        if (!path.empty() && TitleParser().readOneTitle(folder + STR_SLASH + path, titles[k].get()) < 1)
-            titles[k].reset();
-    });
     std::vector<Archive*> result;
-    result.reserve(titles.size());
-    for (std::unique_ptr<Archive>& title : titles) {
+    for (std::unique_ptr<Archive>& title : titles.read(0, titles.count())) {
         if (title)
             result.push_back(title.release());
     }

@@ -54,6 +54,11 @@ public:
     // Takes over the contents of the given record; the name that the item's record has is kept.
     void updateArchiveData(Archive* archive);
 
+    // Held, the item is not given back by its list; see HeldArchiveItem.
+    void hold() { ++mHolds; }
+    void letGo() { --mHolds; }
+    bool isHeld() const { return mHolds > 0; }
+
     // Builds the thumbnail and the text lines. Without a picture it costs a picture file, so the list does it
     // once it is on screen.
     void initArchiveItemChildWidget(const QImage& picture = QImage());
@@ -86,6 +91,7 @@ private:
     Archive* mArchive;
     std::unique_ptr<Archive> mOwnArchive; // only of a clone
     int mType;
+    int mHolds = 0;
     QGraphicsScene* mScene = nullptr;
     QGraphicsPixmapItem* mPixmapItem = nullptr;
     QWidget* mTextWidget = nullptr;

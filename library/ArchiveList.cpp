@@ -3,13 +3,16 @@
 #include "document/Archive.h"
 #include "document/ArchiveController.h"
 #include "document/ArchiveOrder.h"
+#include "document/FolderTitles.h"
 #include "document/TitleParser.h"
+#include "library/ArchiveCheckThread.h"
 #include "library/ArchiveInitThread.h"
 #include "library/ArchiveItem.h"
 #include "library/ArchiveMenu.h"
+#include "library/ArchiveRow.h"
 #include "library/FocusArchiveCommand.h"
 #include "library/ITitlerFolderReporter.h"
-#include "library/SmallPictures.h"
+#include "library/ListMessages.h"
 #include "support/FolderLookup.h"
 #include "support/IPathManagerEx.h"
 #include "support/LeftoverSweep.h"
@@ -22,13 +25,20 @@
 #include <QFile>
 #include <QFileInfo>
 #include <QLabel>
+#include <algorithm>
 #include <string>
 #include <tinyxml.h>
+#include <utility>
+#include <vector>
 
 namespace
 {
 
-const int ITEMS_IN_VIEW = 6;    // before the list scrolls to the selection
+const int ITEMS_IN_VIEW = 6; // before the list scrolls to the selection
+const int MOST_ITEMS = 120;  // more than an operator's folder has titles
+const int ITEMS_KEPT = 60;   // when there are more than that: a few screens on both sides of the view
+// Titles that are read before the list shows: as many as an operator can make.
+constexpr std::size_t AT_ONCE = ListMessages::TITLE_LIMIT;
 const int EFFECTIVE_LEFT = 38;  // the scroll bar lies before it
 const int LOADER_POLL = 1;      // ms
 const int LABEL_FONT_SIZE = 13; // points
@@ -47,6 +57,7 @@ ArchiveList::ArchiveList(QLabel* folderLabel, bool autoInit, QWidget* parent)
     : KSScrollViewerWidget(parent)
     , mController(std::make_unique<ArchiveController>())
     , mFiles(*mController)
+    , mItems(this)
     , mFolderLabel(folderLabel)
     , mMenuFont(QStringLiteral("KST"))
 {
@@ -87,6 +98,10 @@ void ArchiveList::initArchiveListConnect()
     connect(this, &KSScrollViewerWidget::signalItemDrop, this, &ArchiveList::slotItemDrop);
     connect(this, &ArchiveList::signalStartMove, this, &KSScrollViewerWidget::slotStartDrag);
     connect(this, &ArchiveList::signalItemsCanDrag, this, &KSScrollViewerWidget::slotItemsCanDrag);
+    connect(this, &KSScrollViewerWidget::signalVisibleItemsChange, this, [this] {
+        if (mItems.all().size() > MOST_ITEMS && !std::exchange(mGiveBackRequested, true))
+            QMetaObject::invokeMethod(this, &ArchiveList::giveBackItems, Qt::QueuedConnection);
+    });
     connect(this, &ArchiveList::signalAddArchiveData, this, &ArchiveList::slotAddArchiveData,
             Qt::QueuedConnection);
     connect(this, &ArchiveList::signalAddOneArchiveData, this, &ArchiveList::slotAddOneArchiveData,
@@ -142,33 +157,19 @@ void ArchiveList::getArchiveListSuccessed(QList<Archive*> archivesList)
         return;
     }
     clearOldArchiveList();
-    addRecords(archivesList);
-    if (isEmpty()) {
+    std::vector<std::unique_ptr<ScrollViewerRow>> rows;
+    for (Archive* archive : archivesList)
+        rows.push_back(std::make_unique<ArchiveRow>(*this, std::unique_ptr<Archive>(archive)));
+    addRows(std::move(rows), -1);
+    if (isEmpty())
         Q_EMIT startTemplatePicker();
-        return;
-    }
-    selectArchive(0);
-    Q_EMIT signalAddArchiveData();
-}
-
-void ArchiveList::addRecords(const QList<Archive*>& archives)
-{
-    mArchives = archives;
-    QStringList pictures;
-    for (const Archive* archive : mArchives)
-        pictures.append(archive->getFullPathOfThumbnailSmall());
-    QList<KSBaseItemWidget*> items;
-    for (Archive* archive : mArchives)
-        items.append(createBaseItem(archive));
-    addWidgetItems(&items, -1);
-    mSmallPictures = std::make_unique<SmallPictures>(pictures, ArchiveItem::PICTURE_SIZE);
+    else
+        selectArchive(0);
 }
 
 ArchiveItem* ArchiveList::createBaseItem(Archive* archive)
 {
-    auto* item = new ArchiveItem(archive, ArchiveItem::LIST_ITEM, this);
-    mAllItems.append(item);
-    return item;
+    return mItems.make(archive);
 }
 
 ArchiveItem* ArchiveList::createPasteUndoItem(Archive* archive, ArchiveItem* item)
@@ -179,34 +180,176 @@ ArchiveItem* ArchiveList::createPasteUndoItem(Archive* archive, ArchiveItem* ite
     return item;
 }
 
+void ArchiveList::initArchiveListRefreshData()
+{
+    setFolderLabel();
+    readFolder();
+    if (ITitlerFolderReporter* reporter = ITitlerFolderReporter::instance())
+        reporter->editFolderStartStatus(mCurrentPath);
+}
+
+// Which rows are titles depends on their files. Those of a long folder are checked by and by; one title at
+// least is known.
+void ArchiveList::readFolder()
+{
+    const auto titles = std::make_shared<const FolderTitles>(mCurrentPath.toStdString());
+    std::vector<std::unique_ptr<ScrollViewerRow>> rows;
+    rows.reserve(titles->count());
+    std::size_t next = 0;
+    while (rows.empty() && next < titles->count()) {
+        const std::size_t end = std::min(next + AT_ONCE, titles->count());
+        for (std::unique_ptr<Archive>& record : titles->read(next, end - next)) {
+            if (record)
+                rows.push_back(std::make_unique<ArchiveRow>(*this, titles, next, std::move(record)));
+            ++next;
+        }
+    }
+    mReadAtOnce = static_cast<int>(rows.size());
+    for (std::size_t number = next; number < titles->count(); ++number)
+        rows.push_back(std::make_unique<ArchiveRow>(*this, titles, number, nullptr));
+    addRows(std::move(rows), -1);
+    if (next == titles->count())
+        return;
+    mCheck = std::make_unique<ArchiveCheckThread>(titles, next);
+    connect(mCheck.get(), &ArchiveCheckThread::unreadableFound, this, &ArchiveList::removeUnreadable,
+            Qt::QueuedConnection);
+    mCheck->start(QThread::InheritPriority);
+}
+
+void ArchiveList::finishCheck()
+{
+    if (!mCheck)
+        return;
+    mCheck->wait();
+    removeUnreadable();
+    mCheck.reset();
+}
+
+// A title that is shown has been read.
+void ArchiveList::removeUnreadable()
+{
+    const QSet<std::size_t> found = mCheck ? mCheck->takeUnreadable() : QSet<std::size_t>();
+    QList<int> gone;
+    QList<ArchiveItem*> items;
+    for (int i = 0; i < count(); ++i) {
+        const ArchiveRow* row = archiveRow(i);
+        ArchiveItem* item = madeItem(i);
+        if (!row || !(row->isUnreadable() || (!item && found.contains(row->number()))))
+            continue;
+        gone.append(i);
+        if (item)
+            items.append(item);
+    }
+    if (gone.isEmpty())
+        return;
+    for (int* position :
+         {&mOperationPosition, &mSelectedPosition, &mPressPosition, &mMoveSource, &mMoveDestination})
+        *position -=
+            static_cast<int>(std::lower_bound(gone.cbegin(), gone.cend(), *position) - gone.cbegin());
+    removeRows(gone);
+    for (ArchiveItem* item : std::as_const(items))
+        mItems.take(item);
+}
+
+ArchiveRow* ArchiveList::archiveRow(int index) const
+{
+    return static_cast<ArchiveRow*>(row(index)); // the list adds no others
+}
+
+ArchiveItem* ArchiveList::madeItem(int index) const
+{
+    return qobject_cast<ArchiveItem*>(madeWidgetItem(index));
+}
+
+// The file may have gone since it was checked.
+ArchiveItem* ArchiveList::readableItem(int index)
+{
+    if (index < 0)
+        return nullptr;
+    for (;;) {
+        ArchiveItem* item = archiveItem(index);
+        const ArchiveRow* row = archiveRow(index);
+        if (!item || !row || !row->isUnreadable())
+            return item;
+        removeUnreadable();
+        index = qMin(index, count() - 1);
+    }
+}
+
+QString ArchiveList::titlePath(int index) const
+{
+    if (const ArchiveRow* row = archiveRow(index))
+        return QString::fromStdString(row->path());
+    const ArchiveItem* item = madeItem(index);
+    return item ? item->getArchiveDataPath() : QString();
+}
+
+int ArchiveList::findTitle(const QString& path) const
+{
+    const std::string wanted = path.toStdString();
+    for (int i = 0; i < count(); ++i) {
+        const ArchiveRow* row = archiveRow(i);
+        if (row ? row->path() == wanted : titlePath(i) == path)
+            return i;
+    }
+    return -1;
+}
+
+ArchiveItem* ArchiveList::findItem(const QString& path) const
+{
+    ArchiveItem* item = mItems.find(path);
+    return item ? item : archiveItem(findTitle(path));
+}
+
+ArchiveItem* ArchiveList::makeItem(ArchiveRow& row)
+{
+    std::unique_ptr<Archive> record = row.takeRecord();
+    if (!record) {
+        // Without a path nothing can be saved over what could not be read.
+        record = std::make_unique<Archive>();
+        QMetaObject::invokeMethod(this, &ArchiveList::removeUnreadable, Qt::QueuedConnection);
+    }
+    ArchiveItem* item = createBaseItem(mItems.own(std::move(record)));
+    requestContents();
+    return item;
+}
+
+void ArchiveList::requestContents()
+{
+    if (!std::exchange(mContentsRequested, true))
+        Q_EMIT signalAddArchiveData();
+}
+
 void ArchiveList::slotAddArchiveData()
 {
-    for (int i = 0; i < count(); ++i)
-        Q_EMIT signalAddOneArchiveData(archiveItem(i));
+    mContentsRequested = false;
+    for (ArchiveItem* item : mItems.beginToComplete())
+        Q_EMIT signalAddOneArchiveData(item);
 }
 
 void ArchiveList::slotAddOneArchiveData(ArchiveItem* item)
 {
-    // The folder may have changed while the call was queued.
-    const qsizetype index = mAllItems.indexOf(item);
-    if (index < 0)
-        return;
-    // The first items are those of the records, in their order.
-    if (!item->hasChildWidgets())
-        item->initArchiveItemChildWidget(mSmallPictures ? mSmallPictures->take(index) : QImage());
-    if (mSmallPictures && index + 1 == mSmallPictures->count())
-        mSmallPictures.reset();
-    // Queued calls come before updates: what is on screen does not wait for the rest of a long folder.
-    if (getItemIndex(item) == lastVisibleItem())
-        viewport()->repaint();
+    mItems.complete(item);
 }
 
-void ArchiveList::initArchiveListRefreshData()
+// Called after a long folder has been scrolled. What is far from view goes first.
+void ArchiveList::giveBackItems()
 {
-    setFolderLabel();
-    addRecords(mController->getArchiveList(mCurrentPath));
-    if (ITitlerFolderReporter* reporter = ITitlerFolderReporter::instance())
-        reporter->editFolderStartStatus(mCurrentPath);
+    mGiveBackRequested = false;
+    std::vector<std::pair<int, ArchiveItem*>> made; // by their distance from view
+    for (int i = 0; i < count(); ++i) {
+        if (ArchiveItem* item = madeItem(i))
+            made.emplace_back(qMax(firstVisibleItem() - i, i - lastVisibleItem()), item);
+    }
+    std::sort(made.begin(), made.end());
+    for (; static_cast<qsizetype>(made.size()) > ITEMS_KEPT; made.pop_back()) {
+        ArchiveItem* item = made.back().second;
+        const bool isNeeded =
+            item == mSelectedItem || item == mOperationItem || item == mDraggedItem || item->isHeld();
+        ArchiveRow* row = archiveRow(getItemIndex(item));
+        if (!isNeeded && giveBackWidgetItem(item))
+            row->putBack(mItems.take(item));
+    }
 }
 
 void ArchiveList::setFolderLabel()
@@ -235,18 +378,9 @@ int ArchiveList::getItemIndex(ArchiveItem* item) const
     return getIndexOfWidgetItem(item);
 }
 
-ArchiveItem* ArchiveList::findItem(const QString& path) const
-{
-    for (ArchiveItem* item : mAllItems) {
-        if (item->getArchiveDataPath() == path)
-            return item;
-    }
-    return nullptr;
-}
-
 void ArchiveList::selectArchive(int index)
 {
-    ArchiveItem* item = archiveItem(index);
+    ArchiveItem* item = readableItem(index);
     if (mSelectedItem != item)
         setDefaultItemState(mSelectedItem);
     if (item) {
@@ -359,7 +493,7 @@ QList<ArchiveOrder*> ArchiveList::getArchiveOrderList() const
     for (int i = 0; i < count(); ++i) {
         auto* order = new ArchiveOrder;
         order->setArchiveIndex(i);
-        order->setArchivePath(QFileInfo(archiveItem(i)->getArchiveDataPath()).fileName().toStdString());
+        order->setArchivePath(QFileInfo(titlePath(i)).fileName().toStdString());
         orders.append(order);
     }
     return orders;
@@ -396,15 +530,9 @@ void ArchiveList::setMainScene(CanvasScene* mainScene)
 
 void ArchiveList::clearOldArchiveList()
 {
+    mCheck.reset();
     removeAll();
-    mSmallPictures.reset();
-    // Those that undo commands still hold, too: the commands see it. The touch that leads here may be on its
-    // way to another finger's item, which must be there to get it.
-    for (ArchiveItem* item : std::as_const(mAllItems))
-        item->discard();
-    mAllItems.clear();
-    qDeleteAll(mArchives);
-    mArchives.clear();
+    mItems.clear();
 }
 
 void ArchiveList::resetPositions()

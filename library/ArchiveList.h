@@ -9,6 +9,7 @@
 
 #include "canvas/BackgroundPicture.h"
 #include "document/Archive.h"
+#include "library/ArchiveItems.h"
 #include "library/TitleFileOperations.h"
 #include "touchui/KSScrollViewerWidget.h"
 
@@ -20,16 +21,17 @@
 #include <future>
 #include <memory>
 
+class ArchiveCheckThread;
 class ArchiveController;
 class ArchiveInitThread;
 class ArchiveItem;
 class ArchiveMenu;
 class ArchiveOrder;
+class ArchiveRow;
 class CanvasScene;
 class ITitlerAPPEventFilterController;
 class QAction;
 class QLabel;
-class SmallPictures;
 class QUndoCommand;
 
 class ArchiveList : public KSScrollViewerWidget
@@ -51,8 +53,11 @@ public:
     ArchiveItem* getSelectedArchive() const;
     bool IsOptionMenuShowing() const;
     int getItemIndex(ArchiveItem* item) const;
-    // Null when there is no such item.
+    // Null when there is no such item. Items are made when they come into view or are asked for here, and may
+    // be given back when a long folder is scrolled on; who needs one longer holds it.
     ArchiveItem* archiveItem(int index) const;
+    // Full path of the title file, which needs no item. Empty when there is none.
+    QString titlePath(int index) const;
     bool isMoveMode() const { return mMoveMode != 0; }
     // Whether an item is being dragged.
     bool getMoveState() const { return mMoving; }
@@ -86,6 +91,9 @@ public:
     // The given item, or a new, complete one of the record.
     ArchiveItem* createPasteUndoItem(Archive* archive, ArchiveItem* item);
 
+    // The item of a row of this list, with the record that it shows. For the row.
+    ArchiveItem* makeItem(ArchiveRow& row);
+
     // One entry an item, with its index and file name; the caller owns the entries.
     QList<ArchiveOrder*> getArchiveOrderList() const;
     void saveArchiveListOrder();
@@ -93,7 +101,8 @@ public:
     // Emits startTemplatePicker. Any thread.
     void startPicker();
 
-    bool checkArchiveListIsFull() const;
+    // Waits for the titles of a long folder when their number matters.
+    bool checkArchiveListIsFull();
     bool checkDiskSpaceIsFull() const;
 
 Q_SIGNALS:
@@ -155,10 +164,21 @@ private:
     void endInitThread();
     void openFolder(const QString& path);
     void clearOldArchiveList();
+    // Whatever changes the list needs the final places of the titles: waits for a check that still runs.
+    void finishCheck();
+    void removeUnreadable();
+    void readFolder();
+    void requestContents();
+    void giveBackItems();
+    ArchiveRow* archiveRow(int index) const;
+    ArchiveItem* madeItem(int index) const;
+    ArchiveItem* readableItem(int index);
+    int findTitle(const QString& path) const;
+    // False when there is no such title, or its file cannot be read.
+    bool selectTitle(const QString& path);
     void decodeCopyBackground();
     void resetPositions();
     void setFolderLabel();
-    void addRecords(const QList<Archive*>& archives);
     void offerTemplateOrReportFull();
     void showOptionMenu(KSBaseItemWidget* item, QPoint pos, KSScrollViewerWidget* scrollArea);
     void createOptionMenu();
@@ -177,11 +197,13 @@ private:
     std::unique_ptr<ArchiveController> mController;
     TitleFileOperations mFiles;
     std::unique_ptr<ArchiveInitThread> mInitThread;
-    bool mIgnoreLoaded = false; // a loader that is being ended may still deliver
+    bool mIgnoreLoaded = false;                 // a loader that is being ended may still deliver
+    std::unique_ptr<ArchiveCheckThread> mCheck; // while places of titles are not final
+    int mReadAtOnce = 0;                        // titles known to be readable when the folder was opened
     std::unique_ptr<ArchiveMenu> mMenu;
-    QList<Archive*> mArchives;                     // owned
-    std::unique_ptr<SmallPictures> mSmallPictures; // of the records, until all items have theirs
-    QList<ArchiveItem*> mAllItems;                 // listed or held by an undo command; children of the list
+    ArchiveItems mItems;
+    bool mContentsRequested = false;
+    bool mGiveBackRequested = false;
     std::unique_ptr<Archive> mCopyArchive;
     TitlePictures mCopyPictures;
     // The background of the copy, so that the canvas need not decode it when it is pasted.

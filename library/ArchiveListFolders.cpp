@@ -4,12 +4,14 @@
 #include "document/ArchiveController.h"
 #include "library/ArchiveItem.h"
 #include "library/ArchiveList.h"
+#include "library/ArchiveRow.h"
 #include "library/IEditContext.h"
 #include "library/ITitlerFolderReporter.h"
 #include "library/ListMessages.h"
 #include "support/LogManager.h"
 
 #include <QDir>
+#include <QFileInfo>
 
 namespace
 {
@@ -41,7 +43,7 @@ void ArchiveList::openFolder(const QString& path)
 void ArchiveList::refreshArchiveList(QString path)
 {
     openFolder(path);
-    Q_EMIT signalAddArchiveData();
+    requestContents();
     if (!isEmpty() && !isCreateNew()) {
         selectArchive(0);
     } else if (!checkArchiveListIsFull()) {
@@ -57,19 +59,12 @@ void ArchiveList::refreshArchiveListInFile(QString path, QString fileName)
 {
     LOG_DEBUG_OPERATE(L"ArchiveList", 200, L" File:" + fileName.toStdWString());
     openFolder(path);
-    Q_EMIT signalAddArchiveData();
+    requestContents();
 
-    ArchiveItem* wanted = nullptr;
-    const QString filePath = path + QLatin1Char('/') + fileName;
-    for (int i = 0; i < count() && !wanted; ++i) {
-        if (archiveItem(i)->getArchiveDataPath() == filePath)
-            wanted = archiveItem(i);
-    }
-    if (wanted)
-        selectArchive(getItemIndex(wanted));
+    const bool isFound = selectTitle(path + QLatin1Char('/') + fileName);
     if (isCreateNew()) {
         offerTemplateOrReportFull();
-    } else if (!wanted) {
+    } else if (!isFound) {
         if (isEmpty()) {
             Q_EMIT signalUpdateCanvas(nullptr);
             Q_EMIT startTemplatePicker();
@@ -77,6 +72,20 @@ void ArchiveList::refreshArchiveListInFile(QString path, QString fileName)
             selectArchive(0);
         }
     }
+}
+
+bool ArchiveList::selectTitle(const QString& path)
+{
+    const int index = findTitle(path);
+    if (index < 0)
+        return false;
+    archiveItem(index);
+    if (ArchiveRow* row = archiveRow(index); row && row->isUnreadable()) {
+        removeUnreadable();
+        return false;
+    }
+    selectArchive(index);
+    return true;
 }
 
 void ArchiveList::offerTemplateOrReportFull()
@@ -99,6 +108,7 @@ void ArchiveList::refreshArchiveListForChangeFolderName(QString before, QString 
     if (mMainScene)
         mMainScene->folderRenamed(before, after);
     const int selected = getItemIndex(mSelectedItem);
+    const QString fileName = QFileInfo(titlePath(selected)).fileName();
     setDefaultItemState(mSelectedItem);
     mCurrentPath = after;
     clearOldArchiveList();
@@ -108,6 +118,7 @@ void ArchiveList::refreshArchiveListForChangeFolderName(QString before, QString 
         Q_EMIT startTemplatePicker();
         return;
     }
-    selectArchive(qBound(0, selected, count() - 1));
-    Q_EMIT signalAddArchiveData();
+    // Places may differ until all titles are read, names do not.
+    if (fileName.isEmpty() || !selectTitle(after + QLatin1Char('/') + fileName))
+        selectArchive(qBound(0, selected, count() - 1));
 }

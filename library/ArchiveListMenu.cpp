@@ -45,8 +45,10 @@ std::wstring logText(ArchiveAction::ARCHIVE_ACTION_TYPE type)
 
 } // namespace
 
-bool ArchiveList::checkArchiveListIsFull() const
+bool ArchiveList::checkArchiveListIsFull()
 {
+    if (mReadAtOnce < ListMessages::TITLE_LIMIT)
+        finishCheck();
     return count() > ListMessages::TITLE_LIMIT - 1;
 }
 
@@ -198,9 +200,9 @@ void ArchiveList::createArchiveFromTemplate(Archive* temp)
 
 void ArchiveList::emitPasteCommand(std::unique_ptr<Archive> archive)
 {
+    finishCheck();
     mSelectedPosition = getItemIndex(mSelectedItem);
-    Archive* record = archive.release();
-    mArchives.append(record);
+    Archive* record = mItems.own(std::move(archive));
     Q_EMIT pasteCommandSignal(new PasteArchiveCommand(this, record, mOperationPosition, mSelectedPosition));
 }
 
@@ -259,6 +261,7 @@ void ArchiveList::exeDeleteArchive()
     if (!mOperationItem)
         return;
     clearOperationItemState(mOperationItem);
+    finishCheck();
     const int position = getItemIndex(mOperationItem);
     if (position < 0)
         return;
@@ -313,7 +316,7 @@ void ArchiveList::setSystemLanFont(QString family)
     mMenuFont = QFont(family);
     mMenuFont.setPixelSize(MENU_FONT_SIZE);
     ArchiveItem::setSystemFontFamily(family);
-    for (ArchiveItem* item : std::as_const(mAllItems)) // also those that may come back
+    for (ArchiveItem* item : mItems.all()) // also those that may come back
         item->updateRightChild();
 }
 

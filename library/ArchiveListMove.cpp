@@ -7,6 +7,8 @@
 void ArchiveList::moveButtonClicked(bool isMoveMode)
 {
     mMoveMode = isMoveMode ? 1 : 0;
+    if (isMoveMode)
+        finishCheck();
     Q_EMIT signalItemsCanDrag(isMoveMode);
     if (!isMoveMode)
         clearOperationItemState(mOperationItem);

@@ -9,13 +9,6 @@ DeleteArchiveCommand::DeleteArchiveCommand(ArchiveList* list, ArchiveItem* item,
                                            bool isSelected, QUndoCommand* parent)
     : QUndoCommand(parent), mList(list), mItem(item), mPosition(position), mIsSelected(isSelected)
 {
-    mOrderBefore = getArchiveOrderList();
-}
-
-DeleteArchiveCommand::~DeleteArchiveCommand()
-{
-    qDeleteAll(mOrderAfter);
-    qDeleteAll(mOrderBefore);
 }
 
 void DeleteArchiveCommand::redo()
@@ -33,8 +26,6 @@ void DeleteArchiveCommand::redo()
         TitleReports::removeFromContext(path);
         mIsNewInContext = true;
     }
-    qDeleteAll(mOrderAfter);
-    mOrderAfter = getArchiveOrderList();
     if (mIsSelected)
         mList->selectArchive(qMin(mPosition, mList->count() - 1));
 }

@@ -2,8 +2,9 @@
 // so that undo needs no file contents.
 #pragma once
 
+#include "library/HeldArchiveItem.h"
+
 #include <QList>
-#include <QPointer>
 #include <QUndoCommand>
 
 class ArchiveItem;
@@ -16,7 +17,6 @@ public:
     // The list must outlive the command. An item that the list has dropped meanwhile makes it do nothing.
     DeleteArchiveCommand(ArchiveList* list, ArchiveItem* item, int position, bool isSelected,
                          QUndoCommand* parent = nullptr);
-    ~DeleteArchiveCommand() override;
 
     void redo() override;
     void undo() override;
@@ -25,10 +25,8 @@ public:
     QList<ArchiveOrder*> getArchiveOrderList() const;
 
 private:
-    QList<ArchiveOrder*> mOrderAfter;  // owned
-    QList<ArchiveOrder*> mOrderBefore; // owned
     ArchiveList* mList;
-    QPointer<ArchiveItem> mItem;
+    HeldArchiveItem mItem;
     int mPosition;
     bool mIsSelected;
     bool mIsNewInContext = false;

@@ -2,7 +2,8 @@
 // into one step.
 #pragma once
 
-#include <QPointer>
+#include "library/HeldArchiveItem.h"
+
 #include <QUndoCommand>
 
 class ArchiveItem;
@@ -25,7 +26,7 @@ private:
     void changeFocus(ArchiveItem* from, ArchiveItem* to);
 
     ArchiveList* mList;
-    QPointer<ArchiveItem> mItem;
-    QPointer<ArchiveItem> mOldItem;
+    HeldArchiveItem mItem;
+    HeldArchiveItem mOldItem;
     bool mSkipFirst = true;
 };

@@ -1,8 +1,9 @@
 // Moves a title to another place in the list. Describes a drag that the list has already made.
 #pragma once
 
+#include "library/HeldArchiveItem.h"
+
 #include <QList>
-#include <QPointer>
 #include <QUndoCommand>
 
 class ArchiveItem;
@@ -25,7 +26,7 @@ private:
     void moveTo(int position);
 
     ArchiveList* mList;
-    QPointer<ArchiveItem> mItem;
+    HeldArchiveItem mItem;
     int mSource;
     int mDestination;
     bool mSkipFirst = true;

@@ -1,7 +1,8 @@
 // Adds a title, new or pasted, behind the operation item.
 #pragma once
 
-#include <QPointer>
+#include "library/HeldArchiveItem.h"
+
 #include <QUndoCommand>
 
 class Archive;
@@ -20,7 +21,7 @@ public:
 
 private:
     ArchiveList* mList;
-    QPointer<ArchiveItem> mItem;
+    HeldArchiveItem mItem;
     int mOperationPosition;
     int mSelectedPosition;
     int mDoneOnce = 0;

@@ -44,6 +44,8 @@ bool KSScrollViewerWidget::eventFilter(QObject* object, QEvent* event)
             m_board->paintSeparators(painter, static_cast<QPaintEvent*>(event)->rect());
         return true;
     }
+    if (object == m_board->board() && event->type() == QEvent::LayoutRequest)
+        adjustLayout(); // an item wants another size
     if (event->type() == QEvent::Gesture || isTouch(event))
         return handleTouchEventFilter(object, event);
     return QScrollArea::eventFilter(object, event);
@@ -660,7 +662,7 @@ void KSScrollViewerWidget::slotItemsCanDrag(bool canDrag)
     if (m_itemsCanDrag == canDrag)
         return;
     m_itemsCanDrag = canDrag;
-    for (KSBaseItemWidget* item : m_board->items())
+    for (KSBaseItemWidget* item : m_board->widgets())
         item->setDragFlag(canDrag);
     if (!canDrag && m_drag->isActive()) {
         dropItem();

@@ -57,6 +57,7 @@ KSScrollViewerWidget::KSScrollViewerWidget(QWidget* parent)
     connect(&m_drag->edgeTimer, &TouchTimer::timeout, this, &KSScrollViewerWidget::slotHandleMoveTimer);
     connect(&m_stretchTimer, &TouchTimer::timeout, this, &KSScrollViewerWidget::slotHandleStretchTimer);
     connect(m_board, &ScrollViewerBoard::itemDestroyed, this, &KSScrollViewerWidget::itemGone);
+    connect(m_board, &ScrollViewerBoard::itemMade, this, &KSScrollViewerWidget::itemMade);
 
     installEventFilter(this);
     viewport()->installEventFilter(this);
@@ -70,7 +71,7 @@ KSScrollViewerWidget::KSScrollViewerWidget(QWidget* parent)
 KSScrollViewerWidget::~KSScrollViewerWidget()
 {
     disconnect(m_board, nullptr, this, nullptr);
-    for (KSBaseItemWidget* item : m_board->items())
+    for (KSBaseItemWidget* item : m_board->widgets())
         disconnectItem(item);
     m_drag.reset();
 }
@@ -217,6 +218,46 @@ void KSScrollViewerWidget::addWidgetItems(QList<KSBaseItemWidget*>* items, int i
     adjustLayout();
 }
 
+void KSScrollViewerWidget::addRows(std::vector<std::unique_ptr<ScrollViewerRow>> rows, int index)
+{
+    m_board->insert(std::move(rows), index);
+    adjustLayout();
+}
+
+// The place that was kept for it is its own, as a rule.
+void KSScrollViewerWidget::itemMade(KSBaseItemWidget* item)
+{
+    const int height = item->height();
+    {
+        const QScopedValueRollback<bool> guard(m_layingOut, true);
+        connectItem(item);
+    }
+    if (item->height() != height)
+        adjustLayout();
+}
+
+bool KSScrollViewerWidget::giveBackWidgetItem(KSBaseItemWidget* item)
+{
+    const int index = m_board->indexOf(item);
+    const bool isShown = index >= m_firstVisible && index <= m_lastVisible;
+    if (!m_board->row(index) || isShown || m_press.item == item || m_press.object == item)
+        return false;
+    disconnectItem(item);
+    m_board->giveBack(item);
+    item->hide();
+    return true;
+}
+
+ScrollViewerRow* KSScrollViewerWidget::row(int index) const
+{
+    return m_board->row(index);
+}
+
+KSBaseItemWidget* KSScrollViewerWidget::madeWidgetItem(int index) const
+{
+    return m_board->made(index);
+}
+
 void KSScrollViewerWidget::removeWidgetItem(KSBaseItemWidget* item)
 {
     if (item && m_drag->item() == item) {
@@ -238,10 +279,25 @@ void KSScrollViewerWidget::removeWidgetItems(int index, int count)
 {
     if (index < 0 || index >= this->count() || count <= 0)
         return;
-    const QList<KSBaseItemWidget*> gone = itemsOf(index, count);
-    for (KSBaseItemWidget* item : gone) {
+    takeOut(index, count);
+    adjustLayout();
+}
+
+void KSScrollViewerWidget::removeRows(const QList<int>& indexes)
+{
+    for (auto index = indexes.crbegin(); index != indexes.crend(); ++index) {
+        if (*index < m_firstVisible)
+            m_savedValue -= m_board->place(*index).height() + m_board->spacing();
+        takeOut(*index, 1);
+    }
+    m_savedValue = qMax(m_savedValue, 0);
+    adjustLayout();
+}
+
+void KSScrollViewerWidget::takeOut(int index, int count)
+{
+    for (KSBaseItemWidget* item : m_board->take(index, count)) {
         disconnectItem(item);
-        m_board->take(item);
         item->hide();
         if (m_press.item == item) {
             m_press.clearItem();
@@ -250,7 +306,6 @@ void KSScrollViewerWidget::removeWidgetItems(int index, int count)
         }
         breakTouchOf(item);
     }
-    adjustLayout();
 }
 
 void KSScrollViewerWidget::removeWidgetItems(KSBaseItemWidget* item, int count)
@@ -316,7 +371,10 @@ int KSScrollViewerWidget::getIndexOfWidgetItem(const KSBaseItemWidget* item) con
 
 QList<KSBaseItemWidget*> KSScrollViewerWidget::itemsOf(int first, int number) const
 {
-    return first < 0 ? QList<KSBaseItemWidget*>() : m_board->items().mid(first, number);
+    QList<KSBaseItemWidget*> items;
+    for (int i = first; i >= 0 && i < count() && i - first < number; ++i)
+        items.append(m_board->at(i));
+    return items;
 }
 
 QList<KSBaseItemWidget*> KSScrollViewerWidget::getWidgetItems(int index, int count) const
@@ -344,7 +402,7 @@ int KSScrollViewerWidget::getInsertPos(QPoint pos) const
 {
     const int y = toBoard(pos).y();
     int index = 0;
-    while (index < count() && m_board->at(index)->geometry().center().y() < y)
+    while (index < count() && m_board->place(index).center().y() < y)
         ++index;
     return index;
 }
@@ -436,6 +494,8 @@ void KSScrollViewerWidget::changeScrollBarValue(int offset)
 void KSScrollViewerWidget::refreshVisible()
 {
     const ScrollViewerBoard::Range range = m_board->itemsMeeting(calculateVisibleRect());
+    for (int i = range.first; i >= 0 && i <= range.last(); ++i)
+        m_board->at(i);
     if (range.first == m_firstVisible && range.last() == m_lastVisible)
         return;
     m_firstVisible = range.first;
@@ -445,9 +505,9 @@ void KSScrollViewerWidget::refreshVisible()
 
 void KSScrollViewerWidget::moveToWidgetItem(int index)
 {
-    const KSBaseItemWidget* item = m_board->at(index);
-    if (item)
-        slotSetScrollBarValue(index == 0 ? 0 : qBound(m_bar->minimum(), item->y(), m_bar->maximum()));
+    if (index >= 0 && index < count())
+        slotSetScrollBarValue(
+            index == 0 ? 0 : qBound(m_bar->minimum(), m_board->place(index).y(), m_bar->maximum()));
 }
 
 void KSScrollViewerWidget::moveToWidgetItem(KSBaseItemWidget* item)
@@ -457,9 +517,8 @@ void KSScrollViewerWidget::moveToWidgetItem(KSBaseItemWidget* item)
 
 void KSScrollViewerWidget::setLastVisibleItem(int index)
 {
-    const KSBaseItemWidget* item = m_board->at(index);
-    if (item)
-        slotSetScrollBarValue(qMax(item->geometry().bottom() + 1 - height(), m_bar->minimum()));
+    if (index >= 0 && index < count())
+        slotSetScrollBarValue(qMax(m_board->place(index).bottom() + 1 - height(), m_bar->minimum()));
 }
 
 void KSScrollViewerWidget::setLastVisibleItem(KSBaseItemWidget* item)

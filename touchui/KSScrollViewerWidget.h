@@ -3,6 +3,7 @@
 #include "touchui/KSBaseItemWidget.h"
 #include "touchui/ScrollViewerFlick.h"
 #include "touchui/ScrollViewerPress.h"
+#include "touchui/ScrollViewerRow.h"
 
 #include <QList>
 #include <QMargins>
@@ -14,6 +15,7 @@
 
 #include <memory>
 #include <optional>
+#include <vector>
 
 class KSScrollBar;
 class QTouchEvent;
@@ -58,6 +60,15 @@ public:
     virtual void addWidgetItem(KSBaseItemWidget* item, int index);
     // The list object stays the caller's.
     virtual void addWidgetItems(QList<KSBaseItemWidget*>* items, int index);
+    // Rows whose widgets are made when they come into view or are asked for: only getWidgetItem and
+    // getWidgetItems ask. An index as above.
+    void addRows(std::vector<std::unique_ptr<ScrollViewerRow>> rows, int index);
+    // Takes rows out whose indexes rise. What is in view stays where it is.
+    void removeRows(const QList<int>& indexes);
+    // Takes away the widget of a row that was added without one; the row makes another one when it needs one.
+    // The widget stays a hidden descendant of the list, for the caller to delete. False, and nothing happens,
+    // when it is in view, in use by a finger or the row's own.
+    bool giveBackWidgetItem(KSBaseItemWidget* item);
     // The item is hidden and stays a descendant of the list. What is not in the list is ignored.
     virtual void removeWidgetItem(KSBaseItemWidget* item);
     virtual void removeWidgetItem(int index);
@@ -100,6 +111,11 @@ public:
     virtual bool flickAbility() const;
 
     KSBaseItemWidget* getWidgetItem(int index) const;
+    // Null when there is no such row or its widget is not made.
+    KSBaseItemWidget* madeWidgetItem(int index) const;
+    // What the widget of a row is made from; null for a row that was added with its widget. Ends with the
+    // row.
+    ScrollViewerRow* row(int index) const;
     // In widget coordinates; null in a gap.
     KSBaseItemWidget* getWidgetItem(QPoint pos) const;
     int getIndexOfWidgetItem(const KSBaseItemWidget* item) const;
@@ -195,6 +211,8 @@ private:
     void applyBarAlignment();
     void connectItem(KSBaseItemWidget* item);
     void disconnectItem(KSBaseItemWidget* item);
+    void takeOut(int index, int count);
+    void itemMade(KSBaseItemWidget* item);
     void itemGone(QObject* item);
     void refreshVisible();
     void changeScrollBarValue(int offset);

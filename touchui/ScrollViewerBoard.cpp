@@ -5,8 +5,11 @@
 #include <QLabel>
 #include <QPainter>
 #include <QPixmap>
-#include <QVBoxLayout>
 #include <QWidget>
+
+#include <algorithm>
+#include <iterator>
+#include <utility>
 
 namespace
 {
@@ -29,8 +32,8 @@ ScrollViewerBoard::ScrollViewerBoard(QObject* parent)
     : QObject(parent)
     , m_panel(new QWidget)
     , m_board(new QWidget(m_panel))
-    , m_layout(new QVBoxLayout(m_board))
     , m_placeholder(new QLabel(m_board))
+    , m_spacing(SPACING)
 {
     m_panel->setObjectName(QStringLiteral("panelBoard"));
     m_panel->setStyleSheet(QStringLiteral("QWidget#panelBoard { background-color: rgb(51, 51, 51)}"));
@@ -38,104 +41,173 @@ ScrollViewerBoard::ScrollViewerBoard(QObject* parent)
     m_board->setObjectName(QStringLiteral("layoutBoard"));
     m_board->setStyleSheet(QStringLiteral("QWidget#layoutBoard { background-color: rgb(51, 51, 51) }"));
     m_board->setAttribute(Qt::WA_TranslucentBackground);
-    m_layout->setContentsMargins(0, 0, 0, 0);
-    m_layout->setSpacing(SPACING);
-    m_layout->setSizeConstraint(QLayout::SetNoConstraint);
     m_placeholder->setStyleSheet(QStringLiteral("background-color: rgb(51, 51, 51)"));
     m_placeholder->setAttribute(Qt::WA_TranslucentBackground);
     m_placeholder->setFixedSize(0, 0);
     m_placeholder->hide();
 }
 
-KSBaseItemWidget* ScrollViewerBoard::at(int index) const
+ScrollViewerBoard::~ScrollViewerBoard() = default;
+
+KSBaseItemWidget* ScrollViewerBoard::at(int index)
 {
-    return index >= 0 && index < count() ? m_items.at(index) : nullptr;
+    if (index < 0 || index >= count())
+        return nullptr;
+    Row& row = m_rows[static_cast<std::size_t>(index)];
+    if (row.widget)
+        return row.widget;
+    KSBaseItemWidget* item = row.maker->makeWidget();
+    row.widget = item;
+    adopt(item);
+    row.place = placeOf(row, row.place.top());
+    item->setGeometry(row.place);
+    Q_EMIT itemMade(item);
+    return item;
+}
+
+KSBaseItemWidget* ScrollViewerBoard::made(int index) const
+{
+    return index >= 0 && index < count() ? m_rows[static_cast<std::size_t>(index)].widget : nullptr;
+}
+
+ScrollViewerRow* ScrollViewerBoard::row(int index) const
+{
+    return index >= 0 && index < count() ? m_rows[static_cast<std::size_t>(index)].maker.get() : nullptr;
+}
+
+QList<KSBaseItemWidget*> ScrollViewerBoard::widgets() const
+{
+    QList<KSBaseItemWidget*> result;
+    for (const Row& row : m_rows) {
+        if (row.widget)
+            result.append(row.widget);
+    }
+    return result;
 }
 
 int ScrollViewerBoard::indexOf(const KSBaseItemWidget* item) const
 {
-    return item ? static_cast<int>(m_items.indexOf(const_cast<KSBaseItemWidget*>(item))) : -1;
+    if (!item)
+        return -1;
+    const auto found =
+        std::find_if(m_rows.begin(), m_rows.end(), [item](const Row& row) { return row.widget == item; });
+    return found == m_rows.end() ? -1 : static_cast<int>(found - m_rows.begin());
 }
 
-void ScrollViewerBoard::insert(KSBaseItemWidget* item, int index)
+void ScrollViewerBoard::adopt(KSBaseItemWidget* item)
 {
-    if (index < 0 || index > count())
-        index = count();
-    m_items.insert(index, item);
     if (item->parentWidget() != m_board)
         item->setParent(m_board);
     connect(item, &QObject::destroyed, this, &ScrollViewerBoard::forget);
 }
 
+void ScrollViewerBoard::insert(KSBaseItemWidget* item, int index)
+{
+    Row row;
+    row.widget = item;
+    m_rows.insert(m_rows.begin() + boundedIndex(index), std::move(row));
+    adopt(item);
+}
+
+void ScrollViewerBoard::insert(std::vector<std::unique_ptr<ScrollViewerRow>> rows, int index)
+{
+    std::vector<Row> added(rows.size());
+    for (std::size_t i = 0; i < rows.size(); ++i)
+        added[i].maker = std::move(rows[i]);
+    m_rows.insert(m_rows.begin() + boundedIndex(index), std::make_move_iterator(added.begin()),
+                  std::make_move_iterator(added.end()));
+}
+
 void ScrollViewerBoard::take(KSBaseItemWidget* item)
 {
+    if (const int index = indexOf(item); index >= 0)
+        take(index, 1);
+}
+
+QList<KSBaseItemWidget*> ScrollViewerBoard::take(int first, int number)
+{
+    const auto begin = m_rows.begin() + first;
+    const auto end = begin + qMin(number, count() - first);
+    QList<KSBaseItemWidget*> gone;
+    for (auto row = begin; row != end; ++row) {
+        if (!row->widget)
+            continue;
+        disconnect(row->widget, &QObject::destroyed, this, &ScrollViewerBoard::forget);
+        gone.append(row->widget);
+    }
+    m_rows.erase(begin, end);
+    return gone;
+}
+
+void ScrollViewerBoard::giveBack(KSBaseItemWidget* item)
+{
     disconnect(item, &QObject::destroyed, this, &ScrollViewerBoard::forget);
-    m_items.removeOne(item);
-    m_layout->removeWidget(item);
+    m_rows[static_cast<std::size_t>(indexOf(item))].widget = nullptr;
 }
 
 void ScrollViewerBoard::forget(QObject* item)
 {
-    const auto isIt = [item](const KSBaseItemWidget* other) {
-        return static_cast<const QObject*>(other) == item;
-    };
-    m_items.removeIf(isIt);
+    const auto isIt = [item](const Row& row) { return static_cast<const QObject*>(row.widget) == item; };
+    std::erase_if(m_rows, isIt);
     Q_EMIT itemDestroyed(item);
 }
 
 void ScrollViewerBoard::swap(int first, int second)
 {
-    m_items.swapItemsAt(first, second);
-}
-
-int ScrollViewerBoard::spacing() const
-{
-    return m_layout->spacing();
+    std::swap(m_rows[static_cast<std::size_t>(first)], m_rows[static_cast<std::size_t>(second)]);
 }
 
 void ScrollViewerBoard::setSpacing(int spacing)
 {
-    m_layout->setSpacing(qMax(spacing, 0));
+    m_spacing = qMax(spacing, 0);
 }
 
 void ScrollViewerBoard::setMargins(const QMargins& margins)
 {
-    m_layout->setContentsMargins(margins);
+    m_margins = margins;
+}
+
+// An item that is narrower than the board stands in its middle.
+QRect ScrollViewerBoard::placeOf(const Row& row, int top) const
+{
+    const int width = m_board->width() - m_margins.left() - m_margins.right();
+    QSize size(width, 0);
+    if (row.widget)
+        size = QSize(qMin(width, row.widget->maximumWidth()), heightOf(row.widget));
+    else
+        size = QSize(qMin(width, row.maker->size().width()), row.maker->size().height());
+    return QRect(QPoint(m_margins.left() + (width - size.width()) / 2, top), size);
+}
+
+void ScrollViewerBoard::layOut()
+{
+    int y = m_margins.top();
+    const auto layPlaceholder = [&] {
+        m_placeholder->move(m_margins.left(), y);
+        y += m_placeholder->height() + m_spacing;
+    };
+    for (int i = 0; i < count(); ++i) {
+        if (i == m_keptIndex)
+            layPlaceholder();
+        Row& row = m_rows[static_cast<std::size_t>(i)];
+        row.place = placeOf(row, y);
+        if (row.widget)
+            row.widget->setGeometry(row.place);
+        y += row.place.height() + m_spacing;
+    }
+    if (m_keptIndex >= count())
+        layPlaceholder();
+    const bool hasPlaces = !isEmpty() || m_keptIndex >= 0;
+    m_contentsHeight = hasPlaces ? y - m_spacing + m_margins.bottom() : 0;
 }
 
 void ScrollViewerBoard::relayout()
 {
-    const int kept = m_placeholder->isHidden() ? -1 : m_layout->indexOf(m_placeholder);
-    m_layout->removeWidget(m_placeholder);
-    for (int i = 0; i < count(); ++i) {
-        const QLayoutItem* there = m_layout->itemAt(i);
-        if (there && there->widget() == m_items.at(i))
-            continue;
-        m_layout->removeWidget(m_items.at(i));
-        m_layout->insertWidget(i, m_items.at(i));
-    }
-    if (kept >= 0)
-        m_layout->insertWidget(qMin(kept, count()), m_placeholder);
-    const int height = contentsHeight();
-    m_board->setFixedHeight(height);
-    m_panel->setFixedSize(m_panelWidth, height);
-    m_layout->activate();
+    m_keptIndex = qMin(m_keptIndex, count());
+    layOut();
+    m_board->setFixedHeight(m_contentsHeight);
+    m_panel->setFixedSize(m_panelWidth, m_contentsHeight);
     m_board->update();
-}
-
-int ScrollViewerBoard::contentsHeight() const
-{
-    const bool kept = !m_placeholder->isHidden();
-    const int places = count() + (kept ? 1 : 0);
-    if (places == 0)
-        return 0;
-    const QMargins margins = m_layout->contentsMargins();
-    int height = margins.top() + margins.bottom() + spacing() * (places - 1);
-    if (kept)
-        height += m_placeholder->height();
-    for (const KSBaseItemWidget* item : m_items)
-        height += heightOf(item);
-    return height;
 }
 
 void ScrollViewerBoard::setWidths(int panelWidth, int boardWidth)
@@ -148,36 +220,39 @@ void ScrollViewerBoard::setWidths(int panelWidth, int boardWidth)
 void ScrollViewerBoard::showPlaceholder(const QSize& size, int index)
 {
     m_placeholder->setFixedSize(size);
-    m_layout->insertWidget(qBound(0, index, count()), m_placeholder);
     m_placeholder->show();
-    m_layout->activate();
-    m_board->update();
+    movePlaceholder(index);
 }
 
 void ScrollViewerBoard::movePlaceholder(int index)
 {
-    m_layout->removeWidget(m_placeholder);
-    m_layout->insertWidget(qBound(0, index, count()), m_placeholder);
-    m_layout->activate();
+    m_keptIndex = qBound(0, index, count());
+    layOut();
     m_board->update();
 }
 
 void ScrollViewerBoard::hidePlaceholder()
 {
-    if (m_placeholder->isHidden())
-        return;
-    m_layout->removeWidget(m_placeholder);
+    m_keptIndex = -1;
     m_placeholder->setFixedSize(0, 0);
     m_placeholder->hide();
+}
+
+// The first row whose lower edge is not above y.
+std::vector<ScrollViewerBoard::Row>::const_iterator ScrollViewerBoard::firstEndingAt(int y) const
+{
+    return std::partition_point(m_rows.begin(), m_rows.end(),
+                                [y](const Row& row) { return row.place.bottom() < y; });
 }
 
 ScrollViewerBoard::Range ScrollViewerBoard::itemsMeeting(const QRect& rect) const
 {
     Range result;
-    for (int i = 0; i < count(); ++i) {
-        if (m_items.at(i)->geometry().intersects(rect)) {
+    for (auto row = firstEndingAt(rect.top()); row != m_rows.end() && row->place.top() <= rect.bottom();
+         ++row) {
+        if (row->place.intersects(rect)) {
             if (result.count == 0)
-                result.first = i;
+                result.first = static_cast<int>(row - m_rows.begin());
             ++result.count;
         } else if (result.count > 0) {
             break;
@@ -186,26 +261,24 @@ ScrollViewerBoard::Range ScrollViewerBoard::itemsMeeting(const QRect& rect) cons
     return result;
 }
 
-KSBaseItemWidget* ScrollViewerBoard::itemInThePos(const QPoint& pos) const
+KSBaseItemWidget* ScrollViewerBoard::itemInThePos(const QPoint& pos)
 {
-    for (KSBaseItemWidget* item : m_items) {
-        if (item->geometry().contains(pos))
-            return item;
-    }
-    return nullptr;
+    const auto row = firstEndingAt(pos.y());
+    return row != m_rows.end() && row->place.contains(pos) ? at(static_cast<int>(row - m_rows.begin()))
+                                                           : nullptr;
 }
 
-KSBaseItemWidget* ScrollViewerBoard::itemAroundThePos(const QPoint& pos, const QRect& visible) const
+KSBaseItemWidget* ScrollViewerBoard::itemAroundThePos(const QPoint& pos, const QRect& visible)
 {
     const Range range = itemsMeeting(visible);
     for (int i = range.first; i >= 0 && i <= range.last(); ++i) {
-        KSBaseItemWidget* item = m_items.at(i);
+        const QRect row = place(i);
         const bool endsList = i == count() - 1;
-        const int end = item->geometry().bottom() + (endsList ? 0 : spacing());
-        const bool above = pos.y() < item->y() && i == range.first;
+        const int end = row.bottom() + (endsList ? 0 : m_spacing);
+        const bool above = pos.y() < row.top() && i == range.first;
         const bool below = pos.y() > end && i == range.last() && !endsList;
-        if (above || below || (pos.y() >= item->y() && pos.y() <= end))
-            return item;
+        if (above || below || (pos.y() >= row.top() && pos.y() <= end))
+            return at(i);
     }
     return nullptr;
 }
@@ -217,11 +290,9 @@ void ScrollViewerBoard::paintSeparators(QPainter& painter, const QRect& exposed)
     const QPixmap separator(QStringLiteral(":/Pane_Tab/Separator_H"));
     if (separator.isNull())
         return;
-    const KSBaseItemWidget* first = m_items.constFirst();
-    for (int i = 0; i + 1 < count(); ++i) {
-        const QRect line(first->x(), m_items.at(i)->geometry().bottom() + 1, first->width(),
-                         SEPARATOR_HEIGHT);
-        if (line.intersects(exposed))
-            painter.drawPixmap(line, separator);
-    }
+    const QRect first = m_rows.front().place;
+    for (auto row = firstEndingAt(exposed.top() - SEPARATOR_HEIGHT);
+         row != m_rows.end() && row + 1 != m_rows.end() && row->place.bottom() < exposed.bottom(); ++row)
+        painter.drawPixmap(QRect(first.x(), row->place.bottom() + 1, first.width(), SEPARATOR_HEIGHT),
+                           separator);
 }

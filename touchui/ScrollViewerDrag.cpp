@@ -87,7 +87,7 @@ int ScrollViewerDrag::getDropIndicatorID(const QRect& visible, bool tall) const
     std::vector<int> tops;
     tops.reserve(static_cast<std::size_t>(range.count));
     for (int i = 0; i < range.count; ++i)
-        tops.push_back(m_board.at(range.first + i)->y());
+        tops.push_back(m_board.place(range.first + i).y());
     return FlickMotion::dropIndex(tops, range.first, m_board.count(), topIn(m_board.board()), m_dropIndex);
 }
 

@@ -1,6 +1,7 @@
 // The title file and the order file of a folder.
 #include "document/Archive.h"
 #include "document/ArchiveOrder.h"
+#include "document/FolderTitles.h"
 #include "document/TText.h"
 #include "document/TitleParser.h"
 #include "document/TitleParserUtility.h"
@@ -549,6 +550,36 @@ private Q_SLOTS:
         }
         QCOMPARE(found, wanted);
         qDeleteAll(titles);
+    }
+
+    void someTitlesOfALongFolder()
+    {
+        std::vector<ArchiveOrder> rows{row(0, ""), row(1, "ab"), row(2, "torn.xml"), row(3, "gone.xml")};
+        write("torn.xml", "<torn");
+        for (int i = 4; i < 60; ++i) {
+            const std::string name = "title" + std::to_string(i) + ".xml";
+            rows.push_back(row(i, name.c_str()));
+            const auto archive = richTitle(path(name.c_str()));
+            mParser.writeOneTitle(archive.get());
+        }
+        mParser.writeFileOrderInFolder(folder(), rows);
+        const FolderTitles titles(folder());
+        QCOMPARE(titles.count(), rows.size());
+        QVERIFY(titles.read(0) && titles.read(0)->getPath().empty());
+        QVERIFY(titles.path(0).empty());
+        QVERIFY(!titles.read(1) && !titles.canBeTitle(1));
+        QVERIFY(!titles.read(2) && titles.canBeTitle(2));
+        QVERIFY(!titles.read(3));
+        QCOMPARE(titles.fileName(40), std::string("title40.xml"));
+        QCOMPARE(titles.path(40), path("title40.xml"));
+        const auto slice = titles.read(30, 30);
+        QCOMPARE(slice.size(), std::size_t(30));
+        QCOMPARE(slice[10]->getName(), std::string("title40"));
+        QCOMPARE(slice[10]->getOrder(), std::string("41"));
+        QCOMPARE(slice[10]->getPath(), path("title40.xml"));
+        QCOMPARE(slice[10]->getText().size(), std::size_t(3));
+        QCOMPARE(FolderTitles(folder() + "/missing").count(), std::size_t(0));
+        QCOMPARE(FolderTitles(std::string()).count(), std::size_t(0));
     }
 
     void templateRowsPointIntoFolders()

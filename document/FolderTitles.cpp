@@ -1,0 +1,81 @@
+#include "document/FolderTitles.h"
+
+#include "document/Archive.h"
+#include "document/ArchiveOrder.h"
+#include "document/DocumentConstants.h"
+#include "document/TitleParser.h"
+
+#include <algorithm>
+#include <atomic>
+#include <future>
+#include <thread>
+#include <utility>
+
+namespace
+{
+
+constexpr std::size_t EXTENSION_LENGTH = 4; // of ".xml"
+
+// Calls job(0) to job(count - 1), each once, and returns when all are done. The calling thread takes part.
+template <typename Job>
+void onAllCores(std::size_t count, const Job& job)
+{
+    constexpr std::size_t WORTH_A_THREAD = 8;
+    std::atomic<std::size_t> next = 0;
+    const auto work = [&] {
+        for (std::size_t k = next++; k < count; k = next++)
+            job(k);
+    };
+    const std::size_t cores = std::max(std::thread::hardware_concurrency(), 1U);
+    std::vector<std::future<void>> helpers;
+    for (std::size_t i = 1; i < std::min(cores, count / WORTH_A_THREAD); ++i)
+        helpers.push_back(std::async(std::launch::async, work));
+    work();
+    for (std::future<void>& helper : helpers)
+        helper.get();
+}
+
+} // namespace
+
+FolderTitles::FolderTitles(std::string folder) : mFolder(std::move(folder))
+{
+    if (mFolder.empty())
+        return;
+    const std::vector<ArchiveOrder*> rows = TitleParser().readFileOrderInFolder(mFolder);
+    const std::vector<std::unique_ptr<ArchiveOrder>> owner(rows.begin(), rows.end());
+    mNames.reserve(rows.size());
+    for (const ArchiveOrder* row : rows)
+        mNames.push_back(row->getArchivePath());
+}
+
+std::string FolderTitles::path(std::size_t row) const
+{
+    return mNames[row].empty() ? std::string() : mFolder + STR_SLASH + mNames[row];
+}
+
+bool FolderTitles::canBeTitle(std::size_t row) const
+{
+    return mNames[row].empty() || mNames[row].size() >= EXTENSION_LENGTH;
+}
+
+std::unique_ptr<Archive> FolderTitles::read(std::size_t row) const
+{
+    if (!canBeTitle(row))
+        return nullptr;
+    auto archive = std::make_unique<Archive>();
+    const std::string& name = mNames[row];
+    if (name.empty())
+        return archive;
+    archive->setName(name.substr(0, name.size() - EXTENSION_LENGTH));
+    archive->setOrder(std::to_string(row + 1));
+    if (TitleParser().readOneTitle(path(row), archive.get()) < 1)
+        return nullptr;
+    return archive;
+}
+
+std::vector<std::unique_ptr<Archive>> FolderTitles::read(std::size_t first, std::size_t count) const
+{
+    std::vector<std::unique_ptr<Archive>> titles(count);
+    onAllCores(count, [&](std::size_t k) { titles[k] = read(first + k); });
+    return titles;
+}

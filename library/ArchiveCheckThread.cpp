@@ -1,0 +1,66 @@
+#include "library/ArchiveCheckThread.h"
+
+#include "document/Archive.h"
+#include "document/FolderTitles.h"
+#include "support/LogManager.h"
+
+#include <QMutexLocker>
+#include <algorithm>
+#include <string>
+#include <utility>
+
+namespace
+{
+
+constexpr std::size_t SLICE = 250; // titles between two reports
+
+} // namespace
+
+ArchiveCheckThread::ArchiveCheckThread(std::shared_ptr<const FolderTitles> titles, std::size_t first,
+                                       QObject* parent)
+    : QThread(parent), mTitles(std::move(titles)), mFirst(first)
+{
+}
+
+ArchiveCheckThread::~ArchiveCheckThread()
+{
+    mCancelled = true;
+    wait();
+}
+
+QSet<std::size_t> ArchiveCheckThread::takeUnreadable()
+{
+    QMutexLocker lock(&mMutex);
+    return std::exchange(mUnreadable, {});
+}
+
+QSet<std::size_t> ArchiveCheckThread::unreadableIn(std::size_t first, std::size_t count) const
+{
+    QSet<std::size_t> found;
+    for (std::size_t row = first; row < first + count && !mCancelled; ++row) {
+        if (!mTitles->read(row))
+            found.insert(row);
+    }
+    return found;
+}
+
+void ArchiveCheckThread::run()
+{
+    qsizetype unreadable = 0;
+    for (std::size_t row = mFirst; row < mTitles->count(); row += SLICE) {
+        const QSet<std::size_t> found = unreadableIn(row, std::min(SLICE, mTitles->count() - row));
+        if (mCancelled)
+            return;
+        if (found.isEmpty())
+            continue;
+        unreadable += found.size();
+        {
+            QMutexLocker lock(&mMutex);
+            mUnreadable.unite(found);
+        }
+        Q_EMIT unreadableFound();
+    }
+    LOG_DEBUG_OPERATE(L"ArchiveList", 200,
+                      L"read all " + std::to_wstring(mTitles->count()) + L" titles, " +
+                          std::to_wstring(unreadable) + L" of the later ones are unreadable");
+}

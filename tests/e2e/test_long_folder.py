@@ -1,0 +1,139 @@
+"""Folders of a thousand and ten thousand titles: how long they take to show and to close, and what memory they take.
+
+The limits are generous, for machines that are busy; what was measured is printed beside what is aimed at.
+"""
+import os
+import time
+import unittest
+
+import harness
+import longfolder
+
+TITLES = int(os.environ.get("TITLER_LONG_FOLDER", "10000"))
+MANY = 1000
+# Aimed at, and the limit here.
+FIRST_SCREEN = (0.5, 4)  # seconds
+OPEN = (5, 25)
+CLOSE = (2, 8)
+MEMORY = 300  # MB
+GROWTH = 20
+# Points of the window: the pictures of the list's first and seventh row, and places along the scroll bar.
+PICTURES = [(harness.LIST_POINT[0] - 240, harness.LIST_POINT[1] + row * harness.LIST_ROW) for row in (0, 6)]
+BAR = 30
+BAR_PLACES = (300, 500, 700, 900, 1040)
+
+
+class LongFolder(harness.TitlerTest):
+    def memory(self, name="VmRSS"):
+        """In MB."""
+        with open(f"/proc/{self.titler.pid}/status", encoding="ascii") as status:
+            return next(int(line.split()[1]) for line in status if line.startswith(name + ":")) / 1024
+
+    def processor_time(self):
+        with open(f"/proc/{self.titler.pid}/stat", encoding="ascii") as stat:
+            fields = stat.read().rpartition(")")[2].split()
+        return int(fields[11]) + int(fields[12])
+
+    def is_first_screen(self):
+        self.titler.check()
+        return all(self.pixel(*point) == longfolder.PICTURE_COLOUR for point in PICTURES)
+
+    def wait_at_rest(self, seconds=0.5):
+        """Waits until the titler has used no processor for some time; returns when that began."""
+        last, since = self.processor_time(), time.monotonic()
+
+        def is_at_rest():
+            nonlocal last, since
+            now = self.processor_time()
+            if now > last + 1:
+                last, since = now, time.monotonic()
+            return time.monotonic() - since > seconds
+
+        harness.session.wait_until(is_at_rest, 300 * harness.SLOW, "the titler to rest")
+        return since
+
+    def close_and_measure(self):
+        start = self.appliance.mark()
+        began = time.monotonic()
+        self.click_tool("Close")
+        harness.session.wait_until(lambda: not self.window(), 120 * harness.SLOW, "the window to go")
+        took = time.monotonic() - began
+        self.wait_closed(start)
+        return took
+
+    def report(self, what, value, aim, unit):
+        print(f"{what}: {value:.2f} {unit} (aim {aim})", flush=True)
+
+    def check(self, what, value, aim_and_limit):
+        aim, limit = aim_and_limit
+        self.report(what, value, aim, "s")
+        self.assertLess(value, limit * harness.SLOW, what)
+
+    def test_ten_thousand_titles(self):
+        folder = self.folder("Long")
+        stems = longfolder.make(folder, TITLES)
+        with self.subTest("opening"):
+            began = time.monotonic()
+            self.appliance.command(f'edit "{folder}"')
+            harness.session.wait_until(self.is_first_screen, 300 * harness.SLOW, "the first screen of titles")
+            self.check("first screen", time.monotonic() - began, FIRST_SCREEN)
+            self.check("opened", self.wait_at_rest() - began, OPEN)
+            self.report("memory", self.memory(), MEMORY, "MB")
+            self.screenshot("open.png")
+
+        with self.subTest("the end of the list"):
+            self.drag_to_the_end()
+            self.click(harness.LIST_POINT[0], harness.LIST_POINT[1] + 6 * harness.LIST_ROW)
+            harness.session.wait_until(lambda: self.has_selected(TITLES - 1), 20 * harness.SLOW, "the last title")
+            self.display.wait_until_still()
+            self.screenshot("end.png")
+        peak = self.memory("VmHWM")
+        self.report("most memory", peak, MEMORY, "MB")
+        self.check("closed", self.close_and_measure(), CLOSE)
+        self.report("memory after Close", self.memory(), MEMORY, "MB")
+        self.assertLess(peak, MEMORY * harness.SLOW)
+        self.assertEqual([os.path.basename(title.stem) for title in self.titles(folder)], stems)
+        self.assertEqual(len(os.listdir(folder)), 2 * TITLES + 1)
+
+    def drag_to_the_end(self):
+        """A press beside the handle of the scroll bar brings it there, and it can be dragged on."""
+        left, top, _, _ = self.display.geometry(self.window())
+        self.display.xdotool("mousemove", left + BAR, top + BAR_PLACES[-1], "mousedown", 1)
+        self.display.xdotool("mousemove", left + BAR, top + BAR_PLACES[-1] + 39, "mouseup", 1)
+        self.display.wait_until_still(60)
+
+    def has_selected(self, number):
+        with open(os.path.join(self.keep, "k2_ope.log"), encoding="utf-8") as stream:
+            return f"Select  the {number} Thumbnail" in stream.read()
+
+    def test_memory_of_a_thousand_titles_is_given_back(self):
+        folder = self.folder("Long")
+        longfolder.make(folder, MANY)
+        short = self.folder("Short")
+        longfolder.make(short, 7)
+        self.session_in(short)
+        self.session_in(short)
+        before = self.memory()
+        opened = self.session_in(folder)
+        growth = self.memory() - before
+        self.report("memory with a thousand titles", opened, MEMORY, "MB")
+        self.report("of it kept after Close", growth, GROWTH, "MB")
+        self.assertLess(growth, GROWTH * harness.SLOW)
+
+    def session_in(self, folder):
+        """Opens the folder, scrolls through some of it and closes it; returns the memory while it was open."""
+        self.command(f'edit "{folder}"')
+        harness.session.wait_until(self.is_first_screen, 120 * harness.SLOW, "the first screen of titles")
+        self.wait_at_rest()
+        for place in BAR_PLACES:
+            self.click(BAR, place)
+            self.display.wait_until_still(60)
+        self.wait_at_rest()
+        opened = self.memory()
+        self.close_and_measure()
+        self.wait_at_rest()
+        return opened
+
+
+if __name__ == "__main__":
+    unittest.main()
