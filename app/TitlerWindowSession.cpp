@@ -176,8 +176,7 @@ void TitlerWindow::waitUntilSaved()
 void TitlerWindow::saveCurrentTitle()
 {
     mGraphicsView->endTouch(); // an object that is being dragged stays where it is
-    mCanvasScene->clearItemsSelectionAndFocus();
-    mCanvasScene->slotMakeSceneThumnail();
+    mCanvasScene->leaveTitle();
 }
 
 void TitlerWindow::slotPowerOff()
@@ -193,6 +192,8 @@ void TitlerWindow::endProcess()
     mFolderPicker->done(QDialog::Rejected); // a dialog with no Cancel would refuse the end
     saveCurrentTitle();
     waitUntilSaved();
+    if (mInputContext && !KSInputContext::isSoftKeyboardClosed())
+        mInputContext->simpleCloseSoftKeyBoardWindow(); // it would stay up without this process
     close();
     QApplication::closeAllWindows();
     QCoreApplication::quit();

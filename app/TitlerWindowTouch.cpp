@@ -11,11 +11,11 @@
 #include "panel/TextToolsPanel.h"
 #include "support/LogManager.h"
 #include "support/SystemInfo.h"
+#include "touchui/KSInputContext.h"
 #include "touchui/KSPushbutton.h"
 
 #include <QApplication>
 #include <QDebug>
-#include <QInputMethod>
 #include <QInputMethodEvent>
 #include <QMenu>
 #include <QMouseEvent>
@@ -139,9 +139,9 @@ bool TitlerWindow::archiveListIsMoveMode() const
 
 void TitlerWindow::editAndDoneButtonClicked()
 {
-    QInputMethodEvent commit;
-    if (QObject* focus = QGuiApplication::focusObject())
-        QCoreApplication::sendEvent(focus, &commit);
+    // What is being composed goes into the text before that is left.
+    if (mInputContext)
+        mInputContext->sendEvent(QInputMethodEvent());
     mMoveButton->setStyleSheet(mMoveButton->styleSheet());
     sendTransientControlEvent(m_bMoveModeOff);
     changeMoveMode(m_bMoveModeOff);

@@ -38,6 +38,8 @@ constexpr int SafeAreaAboveTexts = 4;
 constexpr double SamePlace = 1e-12;
 // More steps than objects could need to leave a free place.
 constexpr int MaximumCascade = 1000;
+// Undo flag of a change that is more than a preview or the end of one.
+constexpr int COMMITTED = 1;
 
 } // namespace
 
@@ -82,11 +84,9 @@ const Archive* CanvasScene::archive() const
 void CanvasScene::savePreviousArchiveInfo()
 {
     if (itemIsEditorInteraction()) {
-        clearItemsSelectionAndFocus();
+        leaveEditing();
         slotDeleteEmptyItems();
         disableTextPropertyArea();
-        if (KSInputContext* context = KSInputContext::instance())
-            context->dummyCloseSoftKeyBoardWindow();
     } else if (itemIsSelectionMode()) {
         clearItemsSelectionMode();
         slotDeleteEmptyItems();
@@ -104,6 +104,22 @@ void CanvasScene::removeAllItems()
     m_currentPixmapItem = nullptr;
     m_itemForKeyboard = nullptr;
     QGraphicsScene::clear();
+}
+
+void CanvasScene::leaveTitle()
+{
+    leaveEditing();
+    m_currentPressedObjectId = -1; // nor is one spared that a finger was on
+    slotDeleteEmptyItems();
+    slotMakeSceneThumnail();
+}
+
+void CanvasScene::leaveEditing()
+{
+    const bool wasEdited = itemIsEditorInteraction();
+    clearItemsSelectionAndFocus();
+    if (wasEdited)
+        slotSendCustomEvent(nullptr);
 }
 
 void CanvasScene::clearCanvas()
@@ -173,7 +189,7 @@ GraphicsText* CanvasScene::buildPair(TText* record)
 GraphicsText* CanvasScene::rebuildItem(TText* record, TText& lastAlpha)
 {
     if (GraphicsText* old = findTextItem(record->getTextObjectID()))
-        deleteItem(old); // came back with the file, which an emptied canvas does not overwrite
+        deleteItem(old); // came back with a file that could not be written without it
     auto* parent = new GraphicsText(true, nullptr, this);
     parent->setPos(record->getXValue(), record->getYValue());
     parent->setZValue(record->getZValue());
@@ -237,11 +253,10 @@ void CanvasScene::addCGraphicsTextItem()
         saveArchive();
         m_thumbnailNeeded = true;
         clearItemsSelectionAndFocus();
-        slotDeleteEmptyItems();
     } else if (itemIsSelectionMode()) {
         clearItemsSelectionMode();
-        slotDeleteEmptyItems();
     }
+    slotDeleteEmptyItems(); // also one that nobody sees any more: it would count among the four
     if (m_texts->listed().size() >= MAX_TEXT_OBJECTS) {
         Q_EMIT signalTextInserted();
         Q_EMIT signalNewTextInsertedFailed();
@@ -250,6 +265,7 @@ void CanvasScene::addCGraphicsTextItem()
             messages->postMessage(MessageDef::MESSAGE_TEXT_OBJECT_LIMIT);
         return;
     }
+    m_panelTold = false;
     Q_EMIT signalBeginNewTextItem();
     auto* command = new CreateItemCommand(this);
     const bool made = command->objectId() >= 0;
@@ -305,13 +321,18 @@ int CanvasScene::initCGraphicsTextItem()
 
 int CanvasScene::initItemLastAlphaStyleWithLastTextStyle(TText& record)
 {
+    const QString ofLanguage = GraphicsText::LAST_KEEPED_FONT[size_t(m_languageRow)][GraphicsText::Asian];
     QString family;
     int ensureMode = 2;
-    if (m_cnFamilyFlag) {
+    if (m_panelTold) {
+        // What the panel shows holds. It shows the family of a new language until a text is selected.
+        if (m_languageChanged && m_newTextStyle->family() == ofLanguage)
+            ensureMode = 1;
+    } else if (m_cnFamilyFlag) {
         family = FAMILY_FOR_CN_MODULE;
         ensureMode = 0;
     } else if (m_languageChanged) {
-        family = GraphicsText::LAST_KEEPED_FONT[size_t(m_languageRow)][GraphicsText::Asian];
+        family = ofLanguage;
         ensureMode = 1;
     }
     m_languageChanged = false;
@@ -413,7 +434,8 @@ void CanvasScene::slotChangeObjectTextStyle(TText* style, int id, int undoFlag)
 {
     if (!style || style->textItems().empty())
         return;
-    m_newTextStyle->rememberChange(*style);
+    if (undoFlag == COMMITTED)
+        m_newTextStyle->rememberChange(*style);
     const bool same = isTheSame(style);
     GraphicsText* item = m_texts->findTheActiveItem();
     if (!item)
@@ -457,6 +479,7 @@ void CanvasScene::changeItemTextStyleAccordingToItemStatus(GraphicsText* item, T
 void CanvasScene::slotUpdateCurrentTextProperty(TText& style)
 {
     m_newTextStyle->rememberProperty(style);
+    m_panelTold = true;
 }
 
 // Undo commands
@@ -646,8 +669,9 @@ void CanvasScene::resetLastFontInfo()
 
 void CanvasScene::slotSceneInputLanguageChanged(SystemSetupDef::emInputLanguageType language)
 {
-    m_languageRow = GraphicsText::languageRow(language);
-    m_languageChanged = true;
+    const int row = GraphicsText::languageRow(language);
+    m_languageChanged = m_languageChanged || row != m_languageRow;
+    m_languageRow = row;
     resetLastFontInfo();
 }
 

@@ -58,6 +58,9 @@ public:
     void saveArchiveFlag() { m_thumbnailNeeded = true; }
     void createThumnailPicture();
     bool isEditFinish() const;
+    // The operator goes away from the title shown: what is being edited is taken over, blank objects go, and
+    // the pictures are made.
+    void leaveTitle();
     // Shows no title. Nothing is saved.
     void clearCanvas();
 
@@ -158,6 +161,8 @@ protected:
 private:
     void savePreviousArchiveInfo();
     void removeAllItems();
+    // Ends editing and selection, and puts the keyboard away that was open for them.
+    void leaveEditing();
     bool archiveIsNull(const Archive* archive);
     void reportMissingFamily();
     GraphicsText* buildPair(TText* record);
@@ -193,6 +198,7 @@ private:
     QPointer<GraphicsText> m_currentParentItem;
     int m_languageRow = 4;
     bool m_languageChanged = false;
+    bool m_panelTold = false; // of what it shows, for the object that is being made
     int m_topZ = 0;
     bool m_thumbnailNeeded = false;
     int m_module = 0;

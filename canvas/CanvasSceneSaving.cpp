@@ -18,7 +18,8 @@
 
 void CanvasScene::saveArchive()
 {
-    if (!m_archive || enableItems().isEmpty())
+    // An emptied title is saved; one that was empty all the time has nothing to be saved.
+    if (!m_archive || (enableItems().isEmpty() && m_archive->text().empty()))
         return;
     saveArchiveXML(QString::fromStdString(m_archive->getPath()));
     if (m_thumbnailRender)
@@ -32,7 +33,7 @@ void CanvasScene::saveArchiveXML(const QString& path)
     std::vector<TText*> records;
     const QList<GraphicsText*> enabled = m_texts->enabledTexts();
     for (GraphicsText* item : std::as_const(*m_texts).listed()) {
-        if (!enabled.contains(item))
+        if (!enabled.contains(item) || item->isBlank())
             continue;
         TText* record = item->getTextList();
         record->setXValue(float(item->scenePos().x()));
@@ -100,6 +101,9 @@ void CanvasScene::folderRenamed(const QString& before, const QString& after)
     if (!m_archive || QDir::cleanPath(title.path()) != QDir::cleanPath(before))
         return;
     m_archive->setPath((after + QLatin1Char('/') + title.fileName()).toStdString());
-    if (itemIsEditorInteraction())
-        clearItemsSelectionAndFocus();
+    if (!itemIsEditorInteraction())
+        return;
+    leaveEditing();
+    slotDeleteEmptyItems();
+    disableTextPropertyArea();
 }

@@ -36,9 +36,27 @@ void NewTextStyle::rememberChange(const TText& style)
     m_last.setTextAlign(style.getTextAlign());
     m_last.setShadowStyle(style.getShadowStyle());
     m_last.setTextShadow(*style.getTextShadow());
+    takeFirstCharacter(style);
+}
+
+void NewTextStyle::rememberProperty(const TText& style)
+{
+    m_property = style;
+    if (!style.textItems().empty())
+        takeFirstCharacter(style);
+}
+
+void NewTextStyle::takeFirstCharacter(const TText& style)
+{
     auto first = std::make_unique<TextStyle>(*style.textItems().front());
     m_last.releaseVectorTextStyle();
     m_last.setTextItems({first.release()});
+}
+
+QString NewTextStyle::family() const
+{
+    return m_last.textItems().empty() ? QString()
+                                      : QString::fromStdString(m_last.textItems().front()->getFontFamily());
 }
 
 void NewTextStyle::applyTo(TText& record) const

@@ -6,8 +6,8 @@
 
 class FontStyle;
 
-// The style that a new text object starts with: the one sent last by the panel, at first the one remembered
-// from the last run.
+// The style that a new text object starts with: what the panel shows; before it has told that, the change
+// that it sent last, at first the style remembered from the last run.
 class NewTextStyle
 {
 public:
@@ -16,8 +16,9 @@ public:
 
     // The panel changed an object: its first style counts. Nothing without characters.
     void rememberChange(const TText& style);
-    // The panel tells what it shows.
-    void rememberProperty(const TText& style) { m_property = style; }
+    // The panel tells what it shows: shadow, align and the style of one character.
+    void rememberProperty(const TText& style);
+    QString family() const;
 
     // What an emptied object takes for the next character, too.
     TText& lastTextStyle() { return m_last; }
@@ -28,6 +29,8 @@ public:
     TText firstCharacter(const QString& family) const;
 
 private:
+    void takeFirstCharacter(const TText& style);
+
     TText m_last;
     TText m_property;
 };

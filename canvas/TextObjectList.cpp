@@ -3,6 +3,7 @@
 #include "canvas/GraphicsText.h"
 #include "canvas/TextStyleEditor.h"
 #include "document/TText.h"
+#include "touchui/KSInputContext.h"
 
 #include <QGraphicsScene>
 #include <QTextCursor>
@@ -95,6 +96,10 @@ void TextObjectList::restoreZ(GraphicsText* item)
 
 void TextObjectList::release(GraphicsText* item)
 {
+    // An input method may still be composing what belongs to the text.
+    KSInputContext* context = KSInputContext::instance();
+    if (context && item->textInteractionFlags() == Qt::TextEditorInteraction)
+        context->commit();
     item->pushLastEditTextIntoStack();
     QTextCursor cursor = item->textCursor();
     if (cursor.hasSelection()) {

@@ -367,6 +367,7 @@ void TextStyleEditor::changeAllStyleWhenHasSelection(const TText& source, int id
     // Only place and shadow depend on these properties, so the text stays laid out.
     updateWidthAndAlign(m_styles.isEmpty() ? 0.0 : m_lastWidth);
     applyShadow();
+    const bool wasEdited = m_item.textInteractionFlags() == Qt::TextEditorInteraction;
     m_item.setTextInteractionFlags(Qt::NoTextInteraction);
     m_item.setFocusFlag(FocusObject);
     showStyleOfWholeText();
@@ -377,6 +378,9 @@ void TextStyleEditor::changeAllStyleWhenHasSelection(const TText& source, int id
     m_styles.refreshUndoBaseline();
     Q_EMIT m_item.signalNotifyTextPropertyAreaObjectSelectionMode(true, true);
     m_styles.forgetNextInsert();
+    // The object is selected now, and nothing can be typed into it.
+    if (wasEdited)
+        Q_EMIT m_item.signalNotifySceneCurrentObjectInEditMode(nullptr);
 }
 
 void TextStyleEditor::changePartStyleWhenHasSelection(const TText& source, int id, int undoFlag)

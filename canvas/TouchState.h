@@ -34,6 +34,8 @@ struct TouchState {
     End previous;
     End current;
 
+    // The keyboard was asked for since the finger went down, with the selection saved below.
+    bool keyboardAsked = false;
     // Selection that the keyboard knows.
     int savedSelectionStart = -1;
     int savedSelectionEnd = -1;

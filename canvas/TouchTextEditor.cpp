@@ -68,6 +68,7 @@ void TouchTextEditor::mousePress(QGraphicsSceneMouseEvent* event)
     m_state.moved = false;
     m_state.selectionMoved = false;
     m_state.handleMoving = false;
+    m_state.keyboardAsked = false;
     adjustMousePressedPos(event, changePaintStateWhenHandleIsPressed(event->pos()));
     m_item.QGraphicsTextItem::mousePressEvent(event);
     m_state.lastScenePos = event->scenePos();
@@ -191,19 +192,25 @@ void TouchTextEditor::synchronizeKeyBoardCursorPos()
     m_state.handleMoving = false;
     m_state.handleCaret = true;
     m_state.longPressed = false;
-    if (cursor.selectionStart() != m_state.savedSelectionStart ||
-        cursor.selectionEnd() != m_state.savedSelectionEnd) {
-        requestKeyboard();
-        saveSelection();
-    }
+    if (!selectionIsSaved())
+        requestKeyboardForSelection();
     m_longPressTimer.stop();
 }
 
-void TouchTextEditor::saveSelection()
+bool TouchTextEditor::selectionIsSaved() const
 {
+    const QTextCursor cursor = m_item.textCursor();
+    return cursor.selectionStart() == m_state.savedSelectionStart &&
+           cursor.selectionEnd() == m_state.savedSelectionEnd;
+}
+
+void TouchTextEditor::requestKeyboardForSelection()
+{
+    requestKeyboard();
     const QTextCursor cursor = m_item.textCursor();
     m_state.savedSelectionStart = cursor.selectionStart();
     m_state.savedSelectionEnd = cursor.selectionEnd();
+    m_state.keyboardAsked = true;
 }
 
 void TouchTextEditor::requestKeyboard()
@@ -315,7 +322,7 @@ void TouchTextEditor::mouseRelease(QGraphicsSceneMouseEvent* event)
     setBoundingRectLineStatus();
     savePostionMoveUndoCommandWhenPositionChanged();
     moveUpEventPosWhenHasHandleCaret(event);
-    m_item.QGraphicsTextItem::mouseReleaseEvent(event);
+    passReleaseToDocument(event);
     getPressedPos(event->pos());
     m_item.showCurrentTextStyle();
     notifyTextPropertyAreaItemFocusState();
@@ -323,6 +330,16 @@ void TouchTextEditor::mouseRelease(QGraphicsSceneMouseEvent* event)
     showOrHideHandleCaretAccordingCurPos();
     showOrHideSoftWare();
     m_item.update();
+}
+
+// For a release on a widget Qt asks for the keyboard by itself, before caret and selection are where they
+// belong.
+void TouchTextEditor::passReleaseToDocument(QGraphicsSceneMouseEvent* event)
+{
+    QWidget* const widget = event->widget();
+    event->setWidget(nullptr);
+    m_item.QGraphicsTextItem::mouseReleaseEvent(event);
+    event->setWidget(widget);
 }
 
 void TouchTextEditor::enterEditMode()
@@ -456,7 +473,8 @@ void TouchTextEditor::setPreviousAndCurrentCursorPos()
 
 void TouchTextEditor::showOrHideSoftWare()
 {
-    if (m_item.getFocusFlag() == FocusEdit)
+    const bool knowsSelection = m_state.keyboardAsked && selectionIsSaved();
+    if (m_item.getFocusFlag() == FocusEdit && !knowsSelection)
         requestKeyboard();
     else if (m_item.getFocusFlag() == FocusObject)
         Q_EMIT m_item.signalNotifySceneCurrentObjectInEditMode(nullptr);
@@ -470,6 +488,7 @@ void TouchTextEditor::mouseDoubleClick(QGraphicsSceneMouseEvent* event)
     m_state.previous.position = -1;
     m_state.current.position = -1;
     m_state.handleMoving = false;
+    m_state.keyboardAsked = false;
     m_state.doubleClicked = true;
     m_item.setTextInteractionFlags(Qt::TextEditorInteraction);
     m_item.QGraphicsTextItem::mouseDoubleClickEvent(event);
@@ -532,8 +551,7 @@ void TouchTextEditor::longPressed()
     m_item.setTextCursor(cursor);
     setPreviousAndCurrentCursorPos();
     m_state.handleCaret = true;
-    requestKeyboard();
-    saveSelection();
+    requestKeyboardForSelection();
     m_item.update();
 }
 

@@ -74,7 +74,9 @@ private:
     void showOrHideSoftWare();
     void setNearestCurPos();
     static int getSelectionModel(const QTextCursor& word, int position);
-    void saveSelection();
+    bool selectionIsSaved() const;
+    void requestKeyboardForSelection();
+    void passReleaseToDocument(QGraphicsSceneMouseEvent* event);
     void setCursorPosition(int position);
     void selectionFromBeginToEnd(int begin, int end);
     int clampedPosition(int position) const;

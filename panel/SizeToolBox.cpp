@@ -16,6 +16,8 @@
 #include <QRegularExpression>
 #include <QTouchEvent>
 
+#include <utility>
+
 const QString SizeToolBox::REGEXP_VALUE = QStringLiteral("(^[2-9][0-9]{1}$)|(^[1-9][0-9][0-9]$)");
 
 namespace
@@ -105,10 +107,12 @@ void SizeToolBox::setFontSize(const QList<int>& sizes)
 {
     if (sizes.isEmpty())
         return;
-    m_editMark = false;
+    const bool wasEditing = std::exchange(m_editMark, false);
     m_sizes = sizes;
     showText(SizeLadder::displayText(sizes));
     updateButtons();
+    if (wasEditing)
+        leaveEditing();
     Q_EMIT setCurrentSize(getFontSize());
 }
 
@@ -166,11 +170,13 @@ void SizeToolBox::fontSizeChanged(const QString& text)
 {
     if (m_ignoreNext != 0)
         return;
-    m_editMark = false;
+    const bool wasEditing = std::exchange(m_editMark, false);
     bool isNumber = false;
     const int size = text.toInt(&isNumber);
     if (isNumber)
         setAllSizes(size);
+    if (wasEditing)
+        leaveEditing();
 }
 
 void SizeToolBox::setAllSizes(int size)
@@ -357,7 +363,11 @@ void SizeToolBox::leaveEditing()
 {
     m_editMark = false;
     m_edit->deselect();
+    // Qt asks for the end of the soft keyboard only where a field that takes text loses the focus, which a
+    // read-only one is not.
+    if (KSInputContext* input = KSInputContext::instance())
+        input->closeSoftKeyBoardWindowOf(m_box);
     m_edit->setReadOnly(true);
-    m_box->clearFocus(); // which closes the soft keyboard
+    m_box->clearFocus();
     Q_EMIT signalSizeToolBoxEditDone();
 }

@@ -16,6 +16,8 @@
 #include <QHBoxLayout>
 #include <QVBoxLayout>
 
+#include <utility>
+
 const QString TextToolsPanel::EMPTY;
 const QString TextToolsPanel::USELESS_STR;
 const QString TextToolsPanel::FONT_DEFAULT_COLOR = QStringLiteral("#FFFFFF");
@@ -28,6 +30,24 @@ constexpr int BOLD_ROW_SPACING = 24;
 constexpr int LEFT_MARGIN = 40; // the panel begins under the tools bar, left of the window's separator
 constexpr int BLOCK_SPACING = 60;
 const char DEFAULT_FAMILY[] = "KST";
+const char CHINESE_FAMILY[] = "DFHeiW5-A";
+
+QString familyOf(SystemSetupDef::emInformationModel model, SystemSetupDef::emInputLanguageType language)
+{
+    if (model == SystemSetupDef::emInformationModelChina)
+        return QString::fromLatin1(CHINESE_FAMILY);
+    switch (language) {
+    case SystemSetupDef::emInputLanguageChineseSimplified:
+    case SystemSetupDef::emInputLanguageChineseMixed:
+        return QString::fromLatin1(CHINESE_FAMILY);
+    case SystemSetupDef::emInputLanguageKorean:
+        return QStringLiteral("YDGothic 100 Pro");
+    case SystemSetupDef::emInputLanguageJapanese:
+        return QStringLiteral("KST Japanese Pro");
+    default:
+        return QString::fromLatin1(DEFAULT_FAMILY);
+    }
+}
 
 template <typename Layout>
 Layout* newLayout()
@@ -182,29 +202,16 @@ void TextToolsPanel::setSignalValue(bool enabled)
 void TextToolsPanel::setModuleInfo(SystemSetupDef::emInformationModel model)
 {
     m_model = model;
+    if (model == SystemSetupDef::emInformationModelChina)
+        m_defaultFamily = QString::fromLatin1(CHINESE_FAMILY);
 }
 
+// With nothing selected the panel shows what a new text begins with, which a new language changes.
 void TextToolsPanel::displayInputLanguage(SystemSetupDef::emInputLanguageType language)
 {
-    if (m_model == SystemSetupDef::emInformationModelChina) {
-        m_defaultFamily = QStringLiteral("DFHeiW5-A");
-        return;
-    }
-    switch (language) {
-    case SystemSetupDef::emInputLanguageChineseSimplified:
-    case SystemSetupDef::emInputLanguageChineseMixed:
-        m_defaultFamily = QStringLiteral("DFHeiW5-A");
-        break;
-    case SystemSetupDef::emInputLanguageKorean:
-        m_defaultFamily = QStringLiteral("YDGothic 100 Pro");
-        break;
-    case SystemSetupDef::emInputLanguageJapanese:
-        m_defaultFamily = QStringLiteral("KST Japanese Pro");
-        break;
-    default:
-        m_defaultFamily = QString::fromLatin1(DEFAULT_FAMILY);
-        break;
-    }
+    const QString before = std::exchange(m_defaultFamily, familyOf(m_model, language));
+    if (m_defaultFamily != before && !m_family->isBoxEnabled())
+        m_family->setFontFamily(m_defaultFamily);
 }
 
 void TextToolsPanel::translateText()

@@ -62,7 +62,8 @@ public:
     // Whether changes reach the canvas.
     void setSignalValue(bool enabled);
     void setModuleInfo(SystemSetupDef::emInformationModel model);
-    // Sets the family that a text without one gets.
+    // Sets the family that a text without one gets; shows it, when it is another one, unless a text is
+    // selected.
     void displayInputLanguage(SystemSetupDef::emInputLanguageType language);
     QString defaultFamily() const { return m_defaultFamily; }
     void translateText();

@@ -182,6 +182,7 @@ void TextToolsPanel::showFontStyle(const FontStyle& style)
 
 void TextToolsPanel::slotBeginNewTextItem()
 {
+    m_palette->reject(); // a colour that is only tried out is none of a new text
     TText style = getTTextStyleForNew();
     Q_EMIT signalUpdateCurrentTextProperty(style);
 }

@@ -255,16 +255,17 @@ private:
         live = titles.value(stem).saved;
     }
 
-    // An empty canvas is not written: the file keeps its last texts. Texts without a character are not read
-    // back.
+    // Blank texts are not written.
     void save()
     {
         pictureNeeded = true;
-        if (canvas.isEmpty() || live.isEmpty())
+        if (canvas.isEmpty())
             return;
         Texts& saved = titles[canvas].saved;
         saved = live;
-        saved.removeIf([](const auto& entry) { return entry.value().getText().empty(); });
+        saved.removeIf([](const auto& entry) {
+            return QString::fromStdString(entry.value().getText()).simplified().isEmpty();
+        });
     }
 
     void place(int id, QPointF to)

@@ -271,14 +271,18 @@ void tst_canvasscene::newObjectTakesThePanelsStyle()
     Canvas canvas;
     canvas.open({});
     connect(canvas.scene.get(), &CanvasScene::signalBeginNewTextItem, canvas.scene.get(), [&canvas] {
-        TText property = makeSource(makeStyle(""), 1);
+        TText property = makeSource(makeStyle("", "DejaVu Sans", 44), 1);
         property.setTextAlign(1);
         property.setShadowStyle(1);
         property.getTextShadow()->setShadowDirectionX(4);
         canvas.scene->slotUpdateCurrentTextProperty(property);
     });
-    TText sent = makeSource(makeStyle("", "DejaVu Sans", 44), 3);
-    canvas.scene->slotChangeObjectTextStyle(&sent, 1, 1);
+    // What was sent for another object before, or only tried out on it, does not count.
+    canvas.scene->slotSceneInputLanguageChanged(SystemSetupDef::emInputLanguageKorean);
+    for (const int undoFlag : {1, 0}) {
+        TText sent = makeSource(makeStyle("", "KST", 72), 3);
+        canvas.scene->slotChangeObjectTextStyle(&sent, 1, undoFlag);
+    }
     canvas.scene->slotInsertNewTextItem();
     GraphicsText* item = canvas.text(1);
     QCOMPARE(item->getItemTText()->getTextAlign(), 1);

@@ -5,6 +5,8 @@
 #include "touchui/KSInputContext.h"
 
 #include <QClipboard>
+#include <QDir>
+#include <algorithm>
 
 namespace
 {
@@ -40,11 +42,19 @@ class tst_keyboardediting : public QObject
 {
     Q_OBJECT
 
+public:
+    // What a finger does, and in which state it finds the object.
+    enum Touch { TapOnSelected, TapOnEdited, DoubleTap, DoubleTapOnEdited, LongPress };
+    Q_ENUM(Touch)
+
 private Q_SLOTS:
     void initTestCase();
     void init();
     void cleanup();
     void secondTapOpensTheKeyboard();
+    void eachTouchAsksOnce_data();
+    void eachTouchAsksOnce();
+    void draggedSelectionAsksOncePerChange();
     void newTextIsTypedInto();
     void tapOnEmptyCanvasClosesTheKeyboard();
     void fourScripts_data();
@@ -55,6 +65,9 @@ private Q_SLOTS:
     void cursorMessages();
     void cursorInsideACharacter();
     void cursorMessageDuringADrag();
+    void changeOfTheWholeEndsEditing_data();
+    void changeOfTheWholeEndsEditing();
+    void renamedFolderEndsEditing();
     void closeOnText();
     void closeOnEmptiedObject();
     void closeOnBlanks();
@@ -155,6 +168,75 @@ void tst_keyboardediting::secondTapOpensTheKeyboard()
     QCOMPARE(data.selectionMode, 0);
     QCOMPARE(data.lastValue, 300);
     QVERIFY(!KSInputContext::isSoftKeyboardClosed());
+}
+
+void tst_keyboardediting::eachTouchAsksOnce_data()
+{
+    QTest::addColumn<Touch>("touch");
+    QTest::addColumn<int>("begin");
+    QTest::addColumn<int>("end");
+    QTest::addColumn<int>("mode");
+    QTest::newRow("tap on a selected object") << TapOnSelected << 3 << 3 << 0;
+    QTest::newRow("tap on an edited object") << TapOnEdited << 3 << 3 << 0;
+    QTest::newRow("double tap") << DoubleTap << -1 << -1 << 2;
+    QTest::newRow("double tap on an edited object") << DoubleTapOnEdited << -1 << -1 << 2;
+    QTest::newRow("long press") << LongPress << 3 << 4 << 1;
+}
+
+void tst_keyboardediting::eachTouchAsksOnce()
+{
+    QFETCH(Touch, touch);
+    QFETCH(int, begin);
+    QFETCH(int, end);
+    QFETCH(int, mode);
+    TouchCanvas canvas(m_device);
+    canvas.show();
+    canvas.open({makeRecord("MMMMMM")});
+    GraphicsText* item = canvas.text(1);
+    const QPoint place = canvas.caretIn(*item, 3) + QPoint(1, 0);
+    if (touch == DoubleTap)
+        canvas.quickTap(place);
+    else
+        canvas.touchTap(place);
+    if (touch == TapOnEdited || touch == LongPress)
+        canvas.touchTap(canvas.caretIn(*item, 5));
+    if (touch == DoubleTapOnEdited)
+        canvas.quickTap(canvas.caretIn(*item, 5));
+    m_keyboard->shown.clear();
+    canvas.press(place);
+    if (touch == LongPress)
+        QTRY_VERIFY_WITH_TIMEOUT(item->isHandleCaret(), 10000);
+    canvas.release(place);
+    QCOMPARE(m_keyboard->shown.size(), 1);
+    const auto data = m_keyboard->shown.constLast();
+    QCOMPARE(data.title, std::wstring(L"Text Input"));
+    QCOMPARE(data.keyboardType, 1);
+    QCOMPARE(data.selectionStart, begin);
+    QCOMPARE(data.selectionEnd, end);
+    QCOMPARE(data.textLength, end);
+    QCOMPARE(data.selectionMode, mode);
+    QVERIFY(!KSInputContext::isSoftKeyboardClosed());
+}
+
+void tst_keyboardediting::draggedSelectionAsksOncePerChange()
+{
+    TouchCanvas canvas(m_device);
+    canvas.show();
+    canvas.open({makeRecord("MMMMMMMM")});
+    GraphicsText* item = canvas.text(1);
+    canvas.edit(1, canvas.caretIn(*item, 2));
+    sendCursor(2, 5, 5, 1);
+    m_keyboard->shown.clear();
+    canvas.slide(canvas.handleIn(*item, 5), canvas.handleIn(*item, 7));
+    QCOMPARE(item->textCursor().position(), 7);
+    QCOMPARE(m_keyboard->shown.constLast().selectionEnd, 7);
+    QList<int> ends;
+    for (const auto& data : std::as_const(m_keyboard->shown))
+        ends.append(data.selectionEnd);
+    // Lifting the finger selects nothing else.
+    canvas.release(canvas.handleIn(*item, 7));
+    QCOMPARE(m_keyboard->shown.size(), ends.size());
+    QVERIFY(std::adjacent_find(ends.cbegin(), ends.cend()) == ends.cend());
 }
 
 void tst_keyboardediting::newTextIsTypedInto()
@@ -410,6 +492,59 @@ void tst_keyboardediting::cursorMessageDuringADrag()
     canvas.release(canvas.handleIn(*item, 7));
     sendCursor(0, 3, 0, 1);
     QCOMPARE(item->textCursor().position(), 3);
+}
+
+void tst_keyboardediting::changeOfTheWholeEndsEditing_data()
+{
+    QTest::addColumn<int>("property");
+    QTest::newRow("align") << int(GraphicsText::PropertyAlign);
+    QTest::newRow("shadow") << int(GraphicsText::PropertyShadow);
+}
+
+// With all of the text selected these tools apply; the object is selected as one after that.
+void tst_keyboardediting::changeOfTheWholeEndsEditing()
+{
+    QFETCH(int, property);
+    TouchCanvas canvas(m_device);
+    canvas.show();
+    canvas.open({makeRecord("MMMM")});
+    GraphicsText* item = canvas.text(1);
+    canvas.quickTap(canvas.caretIn(*item, 2));
+    canvas.quickTap(canvas.caretIn(*item, 2));
+    QVERIFY(!KSInputContext::isSoftKeyboardClosed());
+    const int before = m_keyboard->dummyClosed;
+    TText source = makeSource(makeStyle("M"), 4);
+    source.setTextAlign(1);
+    source.setShadowStyle(1);
+    canvas.scene->slotChangeObjectTextStyle(&source, property, 1);
+    QCOMPARE(item->textInteractionFlags(), Qt::NoTextInteraction);
+    QCOMPARE(m_keyboard->dummyClosed, before + 1);
+    QVERIFY(KSInputContext::isSoftKeyboardClosed());
+    // A selected object has no keyboard to put away.
+    source.setTextAlign(0);
+    source.setShadowStyle(2);
+    canvas.scene->slotChangeObjectTextStyle(&source, property, 1);
+    QCOMPARE(m_keyboard->dummyClosed, before + 1);
+    QCOMPARE(canvas.stack.count(), 2);
+}
+
+// The file manager renames the open folder in mid word.
+void tst_keyboardediting::renamedFolderEndsEditing()
+{
+    TouchCanvas canvas(m_device);
+    canvas.show();
+    canvas.open({makeRecord("M")});
+    canvas.edit(1, canvas.caretIn(*canvas.text(1), 1));
+    sendText("a");
+    QVERIFY(!KSInputContext::isSoftKeyboardClosed());
+    QSignalSpy exists(canvas.scene.get(), &CanvasScene::signalSceneNotifyIfExistSelectedObject);
+    const QString after = canvas.folder.path() + QStringLiteral("/renamed");
+    QVERIFY(QDir().mkpath(after));
+    canvas.scene->folderRenamed(canvas.folder.path(), after);
+    QVERIFY(!canvas.scene->itemIsEditorInteraction());
+    QVERIFY(KSInputContext::isSoftKeyboardClosed());
+    QVERIFY(!exists.isEmpty() && !exists.constLast().constFirst().toBool());
+    QCOMPARE(canvas.text(1)->toPlainText(), QStringLiteral("Ma"));
 }
 
 void tst_keyboardediting::closeOnText()

@@ -2,8 +2,9 @@
 // KSInputContext::install() before QApplication.
 #pragma once
 
-#include "messaging/services/ISoftKeyBoardController.h"
 #include "messaging/services/SubCommonDefine.h"
+#include "tests/touchui/FakeInputMethod.h"
+#include "tests/touchui/FakeService.h"
 #include "touchui/KSAppEventFilter.h"
 #include "touchui/KSInputContext.h"
 #include "touchui/KSInputFocusManager.h"
@@ -14,44 +15,12 @@
 #include <QGraphicsScene>
 #include <QGraphicsTextItem>
 #include <QGraphicsView>
-#include <QInputMethodEvent>
 #include <QLineEdit>
 #include <QPushButton>
 #include <QRegularExpressionValidator>
 #include <QSignalSpy>
 #include <QTest>
 #include <QVBoxLayout>
-
-class FakeService : public ISoftKeyBoardController
-{
-public:
-    void show(SubCommonDefine::tagSoftKeyBoardInitData data) override
-    {
-        calls.append(QStringLiteral("show"));
-        shown.append(data);
-    }
-    void close() override { calls.append(QStringLiteral("close")); }
-    void dummyClose() override { calls.append(QStringLiteral("dummyClose")); }
-    void simpleClose() override { calls.append(QStringLiteral("simpleClose")); }
-    void sendKey(SubCommonDefine::tagSoftKeyBoardKeyData key) override { keys.append(key); }
-    void sendLimitInfo(SubCommonDefine::taLimitInfo info) override
-    {
-        calls.append(QStringLiteral("sendLimitInfo"));
-        limits.append(info);
-    }
-    void closeLimitBalloon() override { calls.append(QStringLiteral("closeLimitBalloon")); }
-    void showMask() override { calls.append(QStringLiteral("showMask")); }
-    void hideMask() override { calls.append(QStringLiteral("hideMask")); }
-    void registerCallBack(ISoftKeyBoardControllerCallBack*) override
-    {
-        calls.append(QStringLiteral("registerCallBack"));
-    }
-
-    QStringList calls;
-    QList<SubCommonDefine::tagSoftKeyBoardInitData> shown;
-    QList<SubCommonDefine::tagSoftKeyBoardKeyData> keys;
-    QList<SubCommonDefine::taLimitInfo> limits;
-};
 
 // A text item as the canvas has them.
 class FakeTextItem : public QGraphicsTextItem
@@ -100,37 +69,6 @@ public:
         return QRegularExpressionValidator::validate(text, position);
     }
     mutable QStringList asked;
-};
-
-// Stands for an input method that composes.
-class FakeInputMethod : public QPlatformInputContext
-{
-public:
-    bool isValid() const override { return true; }
-    void commit() override
-    {
-        ++commits;
-        if (focus != nullptr && !composed.isEmpty()) {
-            QInputMethodEvent event;
-            event.setCommitString(composed);
-            composed.clear();
-            QCoreApplication::sendEvent(focus, &event);
-        }
-    }
-    void reset() override { ++resets; }
-    bool filterEvent(const QEvent* event) override
-    {
-        events.append(event->type());
-        return takesKeys;
-    }
-    void setFocusObject(QObject* object) override { focus = object; }
-
-    QPointer<QObject> focus;
-    QString composed;
-    QList<int> events;
-    int commits = 0;
-    int resets = 0;
-    bool takesKeys = false;
 };
 
 inline SubCommonDefine::tagSoftKeyBoardKeyData keyRecord(int type, int key, const std::wstring& text = {})

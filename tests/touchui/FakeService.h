@@ -1,0 +1,40 @@
+// Stands for the process that shows the soft keyboard: notes what it is asked for, and answers nothing.
+#pragma once
+
+#include "messaging/services/ISoftKeyBoardController.h"
+#include "messaging/services/SubCommonDefine.h"
+
+#include <QList>
+#include <QString>
+#include <QStringList>
+
+class FakeService : public ISoftKeyBoardController
+{
+public:
+    void show(SubCommonDefine::tagSoftKeyBoardInitData data) override
+    {
+        calls.append(QStringLiteral("show"));
+        shown.append(data);
+    }
+    void close() override { calls.append(QStringLiteral("close")); }
+    void dummyClose() override { calls.append(QStringLiteral("dummyClose")); }
+    void simpleClose() override { calls.append(QStringLiteral("simpleClose")); }
+    void sendKey(SubCommonDefine::tagSoftKeyBoardKeyData key) override { keys.append(key); }
+    void sendLimitInfo(SubCommonDefine::taLimitInfo info) override
+    {
+        calls.append(QStringLiteral("sendLimitInfo"));
+        limits.append(info);
+    }
+    void closeLimitBalloon() override { calls.append(QStringLiteral("closeLimitBalloon")); }
+    void showMask() override { calls.append(QStringLiteral("showMask")); }
+    void hideMask() override { calls.append(QStringLiteral("hideMask")); }
+    void registerCallBack(ISoftKeyBoardControllerCallBack*) override
+    {
+        calls.append(QStringLiteral("registerCallBack"));
+    }
+
+    QStringList calls;
+    QList<SubCommonDefine::tagSoftKeyBoardInitData> shown;
+    QList<SubCommonDefine::tagSoftKeyBoardKeyData> keys;
+    QList<SubCommonDefine::taLimitInfo> limits;
+};
