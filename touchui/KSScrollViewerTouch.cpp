@@ -83,7 +83,8 @@ void KSScrollViewerWidget::handleScrollBarPressedEvent(QEvent* event)
     if (y >= handle.top() && y <= handle.bottom())
         m_bar->update();
     else
-        slotSetScrollBarValue(y * m_board->board()->height() / qMax(height(), 1) - height() / 2);
+        slotSetScrollBarValue(
+            static_cast<int>(qint64(y) * m_board->board()->height() / qMax(height(), 1) - height() / 2));
 }
 
 bool KSScrollViewerWidget::handleTouchEventFilter(QObject* object, QEvent* event)

@@ -61,46 +61,44 @@ class LongFolder(harness.TitlerTest):
         self.wait_closed(start)
         return took
 
-    def report(self, what, value, aim, unit):
+    def report(self, what, value, aim, limit, unit):
+        """Prints what was measured; whether it is within the limit is told at the end of the test."""
         print(f"{what}: {value:.2f} {unit} (aim {aim})", flush=True)
+        if value > limit * harness.SLOW:
+            self.beyond.append(f"{what}: {value:.2f} {unit}, at most {limit * harness.SLOW}")
 
-    def check(self, what, value, aim_and_limit):
-        aim, limit = aim_and_limit
-        self.report(what, value, aim, "s")
-        self.assertLess(value, limit * harness.SLOW, what)
+    def setUp(self):
+        super().setUp()
+        self.beyond = []
 
     def test_ten_thousand_titles(self):
         folder = self.folder("Long")
         stems = longfolder.make(folder, TITLES)
-        with self.subTest("opening"):
-            began = time.monotonic()
-            self.appliance.command(f'edit "{folder}"')
-            harness.session.wait_until(self.is_first_screen, 300 * harness.SLOW, "the first screen of titles")
-            self.check("first screen", time.monotonic() - began, FIRST_SCREEN)
-            self.check("opened", self.wait_at_rest() - began, OPEN)
-            self.report("memory", self.memory(), MEMORY, "MB")
-            self.screenshot("open.png")
+        began = time.monotonic()
+        self.appliance.command(f'edit "{folder}"')
+        harness.session.wait_until(self.is_first_screen, 300 * harness.SLOW, "the first screen of titles")
+        self.report("first screen", time.monotonic() - began, *FIRST_SCREEN, "s")
+        self.report("opened", self.wait_at_rest() - began, *OPEN, "s")
+        self.report("memory", self.memory(), MEMORY, MEMORY, "MB")
 
-        with self.subTest("the end of the list"):
-            self.drag_to_the_end()
-            self.click(harness.LIST_POINT[0], harness.LIST_POINT[1] + 6 * harness.LIST_ROW)
-            harness.session.wait_until(lambda: self.has_selected(TITLES - 1), 20 * harness.SLOW, "the last title")
-            self.display.wait_until_still()
-            self.screenshot("end.png")
-        peak = self.memory("VmHWM")
-        self.report("most memory", peak, MEMORY, "MB")
-        self.check("closed", self.close_and_measure(), CLOSE)
-        self.report("memory after Close", self.memory(), MEMORY, "MB")
-        self.assertLess(peak, MEMORY * harness.SLOW)
+        self.scroll_to_the_end()
+        self.click(harness.LIST_POINT[0], harness.LIST_POINT[1] + 6 * harness.LIST_ROW)
+        harness.session.wait_until(lambda: self.has_selected(TITLES - 1), 20 * harness.SLOW, "the last title")
+        self.display.wait_until_still()
+        self.report("most memory", self.memory("VmHWM"), MEMORY, MEMORY, "MB")
+        self.report("closed", self.close_and_measure(), *CLOSE, "s")
         self.assertEqual([os.path.basename(title.stem) for title in self.titles(folder)], stems)
-        self.assertEqual(len(os.listdir(folder)), 2 * TITLES + 1)
+        self.assertEqual(len([name for name in os.listdir(folder) if name.endswith("_240.png")]), TITLES)
+        self.assertEqual(self.beyond, [])
 
-    def drag_to_the_end(self):
+    def scroll_to_the_end(self):
         """A press beside the handle of the scroll bar brings it there, and it can be dragged on."""
         left, top, _, _ = self.display.geometry(self.window())
-        self.display.xdotool("mousemove", left + BAR, top + BAR_PLACES[-1], "mousedown", 1)
-        self.display.xdotool("mousemove", left + BAR, top + BAR_PLACES[-1] + 39, "mouseup", 1)
+        self.display.xdotool("mousemove", left + BAR, top + BAR_PLACES[2], "mousedown", 1)
         self.display.wait_until_still(60)
+        self.display.xdotool("mousemove", left + BAR, top + harness.session.HEIGHT - 1)
+        self.display.wait_until_still(60)
+        self.display.xdotool("mouseup", 1)
 
     def has_selected(self, number):
         with open(os.path.join(self.keep, "k2_ope.log"), encoding="utf-8") as stream:
@@ -116,9 +114,9 @@ class LongFolder(harness.TitlerTest):
         before = self.memory()
         opened = self.session_in(folder)
         growth = self.memory() - before
-        self.report("memory with a thousand titles", opened, MEMORY, "MB")
-        self.report("of it kept after Close", growth, GROWTH, "MB")
-        self.assertLess(growth, GROWTH * harness.SLOW)
+        self.report("memory with a thousand titles", opened, MEMORY, MEMORY, "MB")
+        self.report("of it kept after Close", growth, GROWTH, GROWTH, "MB")
+        self.assertEqual(self.beyond, [])
 
     def session_in(self, folder):
         """Opens the folder, scrolls through some of it and closes it; returns the memory while it was open."""
