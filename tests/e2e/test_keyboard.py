@@ -82,7 +82,6 @@ class Keyboard(PanelTest):
         self.display.tap(*ON_THE_TEXT)
         self.show_of_one_touch(start)
         self.command("string ++")
-        self.tap(CORNER_OF_CANVAS)
         session.wait_until(lambda: any("++" in text for text in self.title.texts()), 20 * harness.SLOW, "the text")
 
     def test_align_ends_the_text_and_the_keyboard(self):
@@ -173,8 +172,8 @@ class Texts(PanelTest):
         """What a letter of a new text looks like, once it is saved."""
         self.new_text()
         self.command("string x")
+        self.wait_text(self.title, "x")  # is saved by itself; only then it is sure to have come
         self.tap(CORNER_OF_CANVAS)
-        self.wait_text(self.title, "x")
         item = dict(self.new_content().find("text-item").attrib)
         self.tool("Undo")
         self.tool("Undo")
