@@ -359,14 +359,20 @@ void SizeToolBox::clearFocusOfSizeBoxLineEdit(bool clear)
     leaveEditing();
 }
 
+// Qt asks for the end of the soft keyboard only where a field that takes text loses the focus, which a
+// read-only one does not take. Another field may have the keyboard by now.
+void SizeToolBox::closeKeyboard() const
+{
+    KSInputContext* input = KSInputContext::instance();
+    if (input && !KSInputContext::isSoftKeyboardClosed() && input->getFocusWidget() == m_box)
+        input->closeSoftKeyBoardWindow();
+}
+
 void SizeToolBox::leaveEditing()
 {
     m_editMark = false;
     m_edit->deselect();
-    // Qt asks for the end of the soft keyboard only where a field that takes text loses the focus, which a
-    // read-only one is not.
-    if (KSInputContext* input = KSInputContext::instance())
-        input->closeSoftKeyBoardWindowOf(m_box);
+    closeKeyboard();
     m_edit->setReadOnly(true);
     m_box->clearFocus();
     Q_EMIT signalSizeToolBoxEditDone();

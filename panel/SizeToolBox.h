@@ -84,6 +84,7 @@ private:
     void editingLeft();
     void resetLastValidTextAndShowWarning();
     void showWarningMessage();
+    void closeKeyboard() const;
     void leaveEditing();
 
     QLabel* m_label = nullptr;

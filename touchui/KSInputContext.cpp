@@ -432,13 +432,6 @@ void KSInputContext::closeSoftKeyBoardWindow()
     }
 }
 
-void KSInputContext::closeSoftKeyBoardWindowOf(const QWidget* field)
-{
-    if (!m_bClosed && getFocusWidget() == field) {
-        closeSoftKeyBoardWindow();
-    }
-}
-
 void KSInputContext::dummyCloseSoftKeyBoardWindow()
 {
     if (m_controller != nullptr) {

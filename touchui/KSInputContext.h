@@ -84,8 +84,6 @@ public:
     // Ends a field: the state changes at once only in applications other than "Titler"; here the service
     // reports it.
     void closeSoftKeyBoardWindow();
-    // The same where the keyboard is open for this field; else nothing. For fields that end themselves.
-    void closeSoftKeyBoardWindowOf(const QWidget* field);
     // Put the keyboard away without its closing ceremony; closed at once.
     void dummyCloseSoftKeyBoardWindow();
     void simpleCloseSoftKeyBoardWindow();
