@@ -1,8 +1,8 @@
 #include "app/ShowMessageController.h"
 
 #include "app/TitlerToolFactory.h"
+#include "support/LogManager.h"
 
-#include <QDebug>
 #include <mutex>
 
 namespace
@@ -45,7 +45,7 @@ void ShowMessageController::setFactory(TitlerToolFactory* factory)
 {
     if (mConnected)
         return;
-    qDebug() << "ShowMessageController::setFactory";
+    LOG_DEBUG_OPERATE(L"ShowMessageController", 200, L"ShowMessageController::setFactory");
     mProxy = factory->createService<IMessageCenter>(SERVICE_ID);
     if (mProxy)
         mProxy->registerCallBack(this);
@@ -123,8 +123,7 @@ void ShowMessageController::showDialogOpacityWidget()
 
 void ShowMessageController::hideDialogOpacityWidget()
 {
-    if (mainWindowIsShown())
-        Q_EMIT signalsShowDialogMaskWidget(false);
+    Q_EMIT signalsShowDialogMaskWidget(false);
 }
 
 void ShowMessageController::showMessageOpacityWidget()
@@ -135,8 +134,7 @@ void ShowMessageController::showMessageOpacityWidget()
 
 void ShowMessageController::hideMessageOpacityWidget()
 {
-    if (mainWindowIsShown())
-        Q_EMIT signalsShowMessageMaskWidget(false);
+    Q_EMIT signalsShowMessageMaskWidget(false);
 }
 
 void ShowMessageController::getTopWindowNotify(int top)

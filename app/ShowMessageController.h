@@ -41,6 +41,7 @@ public:
 
     void changeTopWindow(MessageDefine::_emTopWindow top);
 
+    // A mask goes up only while the main window shows; it is taken away at any time.
     void showDialogOpacityWidget();
     void hideDialogOpacityWidget();
     void showMessageOpacityWidget();

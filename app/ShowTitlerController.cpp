@@ -1,9 +1,7 @@
 #include "app/ShowTitlerController.h"
 
 #include "app/TitlerToolFactory.h"
-
-#include <QDebug>
-#include <QString>
+#include "support/LogManager.h"
 
 namespace
 {
@@ -39,8 +37,8 @@ void ShowTitlerController::setFactory(TitlerToolFactory* factory)
 
 void ShowTitlerController::changeFolderStatus(SubCommonDefine::tagFOLDER_TYPE folder)
 {
-    qDebug().noquote() << "ShowTitlerController_changeFolderStatus() [setFolderStatus()] Path:" +
-                              QString::fromStdWString(folder.path);
+    LOG_DEBUG_OPERATE(L"ShowTitlerController", 200,
+                      L"ShowTitlerController_changeFolderStatus() [setFolderStatus()] Path:" + folder.path);
     if (mProxy)
         mProxy->setFolderStatus(std::move(folder));
 }

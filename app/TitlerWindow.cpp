@@ -365,6 +365,13 @@ void TitlerWindow::showEvent(QShowEvent* event)
 void TitlerWindow::hideEvent(QHideEvent* event)
 {
     WINDOW_IS_SHOWN = false;
+    if (!event->spontaneous()) {
+        // Whoever asked for a mask may take it away only later, or never.
+        showDialogMaskWidget(false);
+        showMessageMaskWidget(false);
+        if (mInputContext)
+            mInputContext->setWindowID(winId());
+    }
     QMainWindow::hideEvent(event);
 }
 

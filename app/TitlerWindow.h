@@ -195,6 +195,7 @@ private:
     void showDialogMaskWidget(bool show);
     void showMessageMaskWidget(bool show);
     QWidget* createMask() const;
+    void refuseRequest(const QString& path);
 
     void switchTranslator(SystemSetupDef::emSystemLanguageType type);
     void useSpecifiedFont(SystemSetupDef::emSystemLanguageType type);

@@ -12,6 +12,8 @@
 #include "library/FolderPicker.h"
 #include "library/TemplatePicker.h"
 #include "panel/TextToolsPanel.h"
+#include "support/ConfinedPath.h"
+#include "support/IPathManagerEx.h"
 #include "support/LogManager.h"
 #include "touchui/KSInputContext.h"
 
@@ -28,6 +30,11 @@ namespace
 constexpr unsigned SAVE_POLL_SECONDS = 1;
 constexpr int FOCUS_COMMAND_ID = 1;
 constexpr int CANVAS_CHECKER = 2;
+
+bool isBelowTitles(const QString& path)
+{
+    return ConfinedPath::isBelow(&IPathManagerEx::getTitleResourcesPath, path.toStdString());
+}
 
 } // namespace
 
@@ -79,15 +86,23 @@ void TitlerWindow::refreshArchiveList(QString path)
         return;
     }
     const QFileInfo info(path);
-    if (info.isDir()) {
-        mArchiveList->refreshArchiveList(path);
-    } else if (info.exists()) {
-        const qsizetype slash = path.lastIndexOf(QLatin1Char('/'));
-        mArchiveList->refreshArchiveListInFile(path.left(slash), path.mid(slash + 1));
-    } else {
+    const qsizetype slash = path.lastIndexOf(QLatin1Char('/'));
+    if (!info.exists())
         hide();
-    }
+    else if (!isBelowTitles(path) || (!info.isDir() && !isBelowTitles(path.left(slash))))
+        refuseRequest(path);
+    else if (info.isDir())
+        mArchiveList->refreshArchiveList(path);
+    else
+        mArchiveList->refreshArchiveListInFile(path.left(slash), path.mid(slash + 1));
     markOpenFolder();
+}
+
+// As for a path that does not exist: what lies there is not ours to change or to clean up.
+void TitlerWindow::refuseRequest(const QString& path)
+{
+    ConfinedPath::logRefusal(L"a request asks for what lies outside: ", path.toStdString());
+    hide();
 }
 
 void TitlerWindow::closeTitlerWindow()

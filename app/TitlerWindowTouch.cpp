@@ -260,7 +260,7 @@ void TitlerWindow::slotShowMessageMaskWidget(bool isShow)
 
 void TitlerWindow::showDialogMaskWidget(bool show)
 {
-    if (!WINDOW_IS_SHOWN)
+    if (show && !WINDOW_IS_SHOWN)
         return;
     if (!mDialogMask) {
         mDialogMask = createMask();
@@ -281,7 +281,7 @@ void TitlerWindow::showDialogMaskWidget(bool show)
 
 void TitlerWindow::showMessageMaskWidget(bool show)
 {
-    if (!WINDOW_IS_SHOWN)
+    if (show && !WINDOW_IS_SHOWN)
         return;
     if (!mMessageMask) {
         mMessageMask = createMask();
@@ -290,7 +290,7 @@ void TitlerWindow::showMessageMaskWidget(bool show)
         mMessageMask->raise();
     }
     mMessageMask->setVisible(show);
-    const bool isDialogMasked = mDialogMask && mDialogMask->isVisible();
+    const bool isDialogMasked = mDialogMask && !mDialogMask->isHidden();
     setAttribute(Qt::WA_AcceptTouchEvents, !show && !isDialogMasked);
     if (!show || mTextToolsPanel->colorPaletteIsShown())
         mTextToolsPanel->showMessageMaskWidget(show);

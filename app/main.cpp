@@ -4,6 +4,7 @@
 #include "support/FolderLookup.h"
 #include "support/IPathManagerEx.h"
 #include "support/LeftoverSweep.h"
+#include "support/OwnerOnlyFiles.h"
 #include "support/SystemSignalHandler.h"
 #include "touchui/KSInputContext.h"
 
@@ -55,6 +56,7 @@ void sweepSettings()
 
 int main(int argc, char* argv[])
 {
+    OwnerOnlyFiles::setUmask();
     keepMemoryFlat();
     KSInputContext::install();
     QApplication application(argc, argv);

@@ -3,6 +3,7 @@
 #include "appliance/Appliance.h"
 #include "appliance/CommandInterpreter.h"
 #include "appliance/LineReader.h"
+#include "support/OwnerOnlyFiles.h"
 #include "support/SystemSignalHandler.h"
 
 #include <QCommandLineParser>
@@ -27,6 +28,7 @@ void writeEvent(const QJsonObject& event)
 
 int main(int argc, char** argv)
 {
+    OwnerOnlyFiles::setUmask();
     QCoreApplication application(argc, argv);
     QCommandLineParser options;
     options.setApplicationDescription("The appliance around a titler, driven by lines on standard input.");

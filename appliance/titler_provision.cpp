@@ -2,6 +2,7 @@
 // Prints the base path that it filled. Ends 1 when something could not be written.
 
 #include "appliance/TitlerProvision.h"
+#include "support/OwnerOnlyFiles.h"
 
 #include <QApplication>
 #include <QFontInfo>
@@ -9,6 +10,7 @@
 
 int main(int argc, char* argv[])
 {
+    OwnerOnlyFiles::setUmask();
     // Pictures are the same without a display, and there need not be one.
     qputenv("QT_QPA_PLATFORM", "offscreen");
     const QApplication application(argc, argv);

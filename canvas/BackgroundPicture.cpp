@@ -1,8 +1,8 @@
 #include "canvas/BackgroundPicture.h"
 
+#include "document/PictureReader.h"
+
 #include <QFile>
-#include <QFileInfo>
-#include <QImageReader>
 #include <cstring>
 #include <vector>
 
@@ -106,9 +106,7 @@ bool BackgroundPicture::isThatOf(const QString& path, const struct stat& status)
 // canvas, and four megabytes large.
 QImage BackgroundPicture::read(const QString& path)
 {
-    if (!QFileInfo(path).isFile()) // a pipe would be waited for
-        return {};
-    QImage image = QImageReader(path).read();
+    QImage image = PictureReader::read(path);
     if (!image.isNull())
         image.convertTo(image.hasAlphaChannel() ? QImage::Format_ARGB32_Premultiplied : QImage::Format_RGB32);
     return image;

@@ -7,6 +7,7 @@
 #include "canvas/TextObjectList.h"
 #include "document/Archive.h"
 #include "document/CanvasController.h"
+#include "document/PngWriter.h"
 #include "document/TText.h"
 
 #include <QDir>
@@ -92,7 +93,7 @@ void CanvasScene::generateThumbnail(QSize size, const QString& path)
     painter.setRenderHint(QPainter::Antialiasing);
     render(&painter);
     painter.end();
-    picture.save(path);
+    PngWriter::save(picture.toImage(), path);
 }
 
 void CanvasScene::folderRenamed(const QString& before, const QString& after)

@@ -2,7 +2,9 @@
 
 #include "document/DocumentConstants.h"
 #include "document/TText.h"
+#include "support/ConfinedPath.h"
 
+#include <QFile>
 #include <QFileInfo>
 
 namespace
@@ -87,26 +89,37 @@ bool Archive::isPreset() const
 
 QString Archive::besideTitle(const std::string& name) const
 {
-    return QFileInfo(toQString(mPath)).path() + QLatin1Char('/') + toQString(name);
+    return confined(folder() + '/' + name);
+}
+
+std::string Archive::folder() const
+{
+    return QFile::encodeName(QFileInfo(toQString(mPath)).path()).toStdString();
+}
+
+QString Archive::confined(const std::string& path) const
+{
+    const std::string allowed = ConfinedPath::namedByTitle(folder(), path);
+    return allowed.empty() ? QString() : toQString(allowed);
 }
 
 QString Archive::getFullPathOfThumbnailSmall() const
 {
     if (mThumbnailSmall.empty())
         return QString();
-    return mThumbnailSmall.front() == '/' ? toQString(mThumbnailSmall) : besideTitle(mThumbnailSmall);
+    return mThumbnailSmall.front() == '/' ? confined(mThumbnailSmall) : besideTitle(mThumbnailSmall);
 }
 
 QString Archive::getFullPathOfBgResource() const
 {
     if (mBgResource.empty())
         return QString();
-    return isPreset() ? toQString(mBgResource) : besideTitle(mBgResource);
+    return isPreset() ? confined(mBgResource) : besideTitle(mBgResource);
 }
 
 QString Archive::getFullPathOfBgResourceBig() const
 {
     if (mBgResourceBig.empty())
         return QString();
-    return isPreset() ? toQString(mBgResourceBig) : besideTitle(mBgResourceBig);
+    return isPreset() ? confined(mBgResourceBig) : besideTitle(mBgResourceBig);
 }

@@ -84,14 +84,17 @@ public:
     // Whether the background lies outside the title's folder.
     bool isPreset() const;
 
-    // Full paths; null for a picture that the title does not have.
+    // Full paths; null for a picture that the title does not have, and for one that lies where no titles and
+    // templates are (see ConfinedPath).
     QString getFullPathOfThumbnailSmall() const;
     QString getFullPathOfBgResource() const;
     QString getFullPathOfBgResourceBig() const; // taken as absolute when the 1280 wide background is
 
 private:
     void cloneText(const std::vector<TText*>& text);
+    std::string folder() const;
     QString besideTitle(const std::string& name) const;
+    QString confined(const std::string& path) const;
 
     std::string mName;
     std::string mPath;

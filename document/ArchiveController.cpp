@@ -6,10 +6,10 @@
 #include "document/DocumentConstants.h"
 #include "document/FolderTitles.h"
 #include "document/ITitleChangeReporter.h"
+#include "support/ConfinedPath.h"
 #include "support/LogManager.h"
 #include "support/SystemInfo.h"
 
-#include <QDebug>
 #include <algorithm>
 #include <memory>
 #include <stdexcept>
@@ -24,15 +24,22 @@ constexpr std::size_t NUMBER_LENGTH = 3;
 constexpr int LARGEST_NUMBER = 999;
 constexpr std::size_t MOST_NUMBERS = 997;
 
+void logDebug(const std::wstring& text)
+{
+    LOG_DEBUG_OPERATE(L"ArchiveController", 200, text);
+}
+
 QString toQString(const std::string& text)
 {
     return QString::fromLocal8Bit(text.data(), static_cast<qsizetype>(text.size()));
 }
 
+// Empty for a name that leads to where no titles and templates are.
 std::string beside(const Archive& archive, const std::string& name)
 {
     const std::string path = archive.getPath();
-    return path.substr(0, path.rfind('/')) + '/' + name;
+    const std::string folder = path.substr(0, path.rfind('/'));
+    return ConfinedPath::namedByTitle(folder, folder + '/' + name);
 }
 
 // The number of a row "UserTemplate_NNN/Titler.xml"; 0 for any other.
@@ -95,7 +102,7 @@ QList<Archive*> ArchiveController::getArchiveList(QString folder)
         const std::vector<Archive*> titles = mArchiveManager->getArchivesUnderFolder(path);
         return QList<Archive*>(titles.begin(), titles.end());
     } catch (const std::out_of_range&) {
-        qWarning() << "The order file names what cannot be a title:" << folder;
+        logDebug(L"The order file names what cannot be a title: " + folder.toStdWString());
         return readableArchives(path);
     }
 }
@@ -111,11 +118,11 @@ bool ArchiveController::saveNewArchive(QString path, Archive* archive)
         return false;
     const int result = mArchiveManager->saveArchive(archive->getPath(), archive);
     if (result == 1)
-        qDebug("Save new Archive Success !");
+        logDebug(L"Save new Archive Success !");
     else if (result == 0)
-        qDebug("Save new Archive Path is invalid !");
+        logDebug(L"Save new Archive Path is invalid !");
     else
-        qDebug("Save new Archive failed !");
+        logDebug(L"Save new Archive failed !");
     return result == 1;
 }
 
@@ -249,12 +256,12 @@ void ArchiveController::deleteUnusefulArchives(QString folder)
     }
     for (const std::string& victim : victims) {
         if (mArchiveManager->deleteArchive(victim) != 1) {
-            qDebug("Delete XML false");
+            logDebug(L"Delete XML false");
             continue;
         }
         if (ITitleChangeReporter* reporter = ITitleChangeReporter::instance())
             reporter->changeTitlerStatus(FileManagerDefine::TITLE_DELETED, toQString(victim));
-        qDebug("Delete XML success");
+        logDebug(L"Delete XML success");
     }
 }
 

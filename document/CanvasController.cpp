@@ -1,8 +1,7 @@
 #include "document/CanvasController.h"
 
 #include "document/ArchiveManager.h"
-
-#include <QDebug>
+#include "support/LogManager.h"
 
 CanvasController::CanvasController() : mArchiveManager(ArchiveManager::getInstance())
 {
@@ -13,12 +12,10 @@ void CanvasController::saveArchiveChange(QString path, Archive* archive)
     if (path.isEmpty())
         return;
     const int result = mArchiveManager->saveArchive(path.toStdString(), archive);
-    if (result == 1)
-        qDebug("Save Archive Success !");
-    else if (result == 0)
-        qDebug("Path is invalid !");
-    else
-        qDebug("Save Archive failed !");
+    const wchar_t* const text = result == 1   ? L"Save Archive Success !"
+                                : result == 0 ? L"Path is invalid !"
+                                              : L"Save Archive failed !";
+    LOG_DEBUG_OPERATE(L"CanvasController", 200, text);
 }
 
 int CanvasController::getTextStyle(FontStyle* style)

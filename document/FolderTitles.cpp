@@ -4,6 +4,7 @@
 #include "document/ArchiveOrder.h"
 #include "document/DocumentConstants.h"
 #include "document/TitleParser.h"
+#include "support/ConfinedPath.h"
 
 #include <algorithm>
 #include <atomic>
@@ -68,7 +69,8 @@ std::unique_ptr<Archive> FolderTitles::read(std::size_t row) const
         return archive;
     archive->setName(name.substr(0, name.size() - EXTENSION_LENGTH));
     archive->setOrder(std::to_string(row + 1));
-    if (TitleParser().readOneTitle(path(row), archive.get()) < 1)
+    const std::string title = ConfinedPath::namedByOrder(mFolder, name);
+    if (title.empty() || TitleParser().readOneTitle(title, archive.get()) < 1)
         return nullptr;
     return archive;
 }

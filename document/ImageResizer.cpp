@@ -1,5 +1,6 @@
 #include "document/ImageResizer.h"
 
+#include "document/PictureReader.h"
 #include "document/PngWriter.h"
 #include "support/LocaleText.h"
 #include "support/k2sys/k2sys.h"
@@ -29,7 +30,7 @@ std::wstring extensionOf(const std::wstring& path)
 
 QImage loadImage(const std::wstring& path)
 {
-    return QImage(QString::fromStdWString(path));
+    return PictureReader::read(QString::fromStdWString(path));
 }
 
 // The reduction works on colour bytes, and a palette cannot be painted on.
@@ -77,7 +78,7 @@ bool ImageResizer::resizeImageToThumbnail(const QImage& source, const std::wstri
         const std::lock_guard lock(gCheckerMutex);
         checkerPath = QString::fromStdString(checkerFname_in_title);
     }
-    QImage checker = with32Bits(QImage(checkerPath));
+    QImage checker = with32Bits(PictureReader::read(checkerPath));
     if (!checker.isNull()) {
         QPainter painter(&checker);
         painter.setCompositionMode(QPainter::CompositionMode_SourceOver);

@@ -163,5 +163,5 @@ bool PngWriter::save(const QImage& image, const QString& path, AtomicFile::Durab
     if (bytes.isEmpty())
         return false;
     return AtomicFile::write(path.toStdString(), {bytes.constData(), static_cast<std::size_t>(bytes.size())},
-                             durability);
+                             durability, AtomicFile::Links::Replace);
 }

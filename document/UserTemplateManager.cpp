@@ -7,6 +7,7 @@
 #include "document/DocumentConstants.h"
 #include "document/LastSettingParser.h"
 #include "document/TitleParserUtility.h"
+#include "support/ConfinedPath.h"
 #include "support/FolderLookup.h"
 #include "support/HiddenName.h"
 #include "support/IPathManagerEx.h"
@@ -132,7 +133,8 @@ int UserTemplateManager::makeFolderList()
     std::multimap<long long, std::string> byTime;
     for (const std::string& name : entriesOf(mRootFolder)) {
         // One name that XML cannot hold would make the whole order file unreadable.
-        if (!isEntryName(name) || !isFolder(mRootFolder + STR_SLASH + name))
+        if (!isEntryName(name) || !isFolder(mRootFolder + STR_SLASH + name) ||
+            !isTemplatePath(titlePathOf(name)))
             continue;
         if (!exists(mRootFolder + STR_SLASH + name + STR_SLASH + name + XML_EXTENSION) &&
             !exists(titlePathOf(name)))
@@ -189,7 +191,8 @@ int UserTemplateManager::loadTemplate(std::string name, Archive* archive)
 {
     if (!archive)
         return 0;
-    const int result = ArchiveManager().loadArchive(titlePathOf(name), archive);
+    const std::string path = titlePathOf(name);
+    const int result = isTemplatePath(path) ? ArchiveManager().loadArchive(path, archive) : 0;
     archive->setName(std::move(name));
     return result;
 }
@@ -208,6 +211,10 @@ int UserTemplateManager::createNewTemplateXml(std::string name, Archive* archive
         return 0;
     }
     const std::string titlePath = titlePathOf(name);
+    if (!isTemplatePath(titlePath)) {
+        ConfinedPath::logRefusal(L"a template lies outside: ", titlePath);
+        return 0;
+    }
     if (exists(titlePath))
         std::cout << "S16 File is already exist. " << titlePath << std::endl;
     const std::string extension = pictureExtensionIn(folder);
@@ -222,6 +229,10 @@ int UserTemplateManager::createNewTemplateXml(std::string name, Archive* archive
 
 int UserTemplateManager::deleteTemplatePath(std::string path)
 {
+    if (!isTemplatePath(path)) {
+        ConfinedPath::logRefusal(L"a template lies outside: ", path);
+        return 0;
+    }
     const int result = ArchiveManager().deleteArchive(path);
     const std::string folder = fs::path(path).lexically_normal().parent_path().string();
     if (isTemplateFolder(folder)) {
@@ -235,6 +246,13 @@ int UserTemplateManager::deleteTemplatePath(std::string path)
 std::string UserTemplateManager::titlePathOf(const std::string& name) const
 {
     return mRootFolder + STR_SLASH + name + STR_SLASH + TITLE_STEM + XML_EXTENSION;
+}
+
+bool UserTemplateManager::isTemplatePath(const std::string& path) const
+{
+    const bool isAbsolute = path.starts_with('/');
+    return !mRootFolder.empty() &&
+           ConfinedPath::isBelow(mRootFolder, isAbsolute ? path : mRootFolder + STR_SLASH + path);
 }
 
 // Paths come from files and from other processes: what is emptied must be one of our folders.

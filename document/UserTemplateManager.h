@@ -53,8 +53,12 @@ public:
     int createNewTemplateXml(std::string name, Archive* archive);
 
     // Removes the template with this title file, its folder and all that this holds, and makes the order
-    // anew. Folders that lie elsewhere than in the root stay. 1 when the title file was removed.
+    // anew. What lies elsewhere than below the root stays. 1 when the title file was removed.
     int deleteTemplatePath(std::string path);
+
+    // Whether a path lies below the root with all links resolved. One that is not absolute is one in the
+    // root.
+    bool isTemplatePath(const std::string& path) const;
 
 private:
     UserTemplateManager() = default;

@@ -2,6 +2,7 @@
 
 #include "document/Archive.h"
 #include "document/FolderTitles.h"
+#include "support/AlternateStack.h"
 #include "support/LogManager.h"
 
 #include <QMutexLocker>
@@ -46,6 +47,7 @@ QSet<std::size_t> ArchiveCheckThread::unreadableIn(std::size_t first, std::size_
 
 void ArchiveCheckThread::run()
 {
+    AlternateStack::useInThisThread();
     qsizetype unreadable = 0;
     for (std::size_t row = mFirst; row < mTitles->count(); row += SLICE) {
         const QSet<std::size_t> found = unreadableIn(row, std::min(SLICE, mTitles->count() - row));

@@ -1,6 +1,7 @@
 #include "library/ArchiveInitThread.h"
 
 #include "document/Archive.h"
+#include "support/AlternateStack.h"
 
 #include <QMetaMethod>
 #include <QMutexLocker>
@@ -22,6 +23,7 @@ ArchiveInitThread::~ArchiveInitThread()
 
 void ArchiveInitThread::run()
 {
+    AlternateStack::useInThisThread();
     QList<Archive*> archives = mController.getArchiveList(mFolder);
     {
         // Not held during the announcement, which waits for the GUI thread.

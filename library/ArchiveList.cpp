@@ -13,6 +13,7 @@
 #include "library/FocusArchiveCommand.h"
 #include "library/ITitlerFolderReporter.h"
 #include "library/ListMessages.h"
+#include "support/ConfinedPath.h"
 #include "support/FolderLookup.h"
 #include "support/IPathManagerEx.h"
 #include "support/LeftoverSweep.h"
@@ -112,7 +113,8 @@ void ArchiveList::initArchiveList()
 {
     const QString last = mController->getLastFolderPath();
     const auto folders = mController->getFolderList();
-    if (!last.isEmpty() && QDir(last).exists())
+    if (!last.isEmpty() && QDir(last).exists() &&
+        ConfinedPath::isBelow(&IPathManagerEx::getTitleResourcesPath, last.toStdString()))
         mCurrentPath = last;
     else if (!folders.isEmpty())
         mCurrentPath = QString::fromStdString(folders.front());

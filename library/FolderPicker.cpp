@@ -11,12 +11,14 @@
 #include "library/TemplateThumbnail.h"
 #include "library/TitleFileOperations.h"
 #include "library/TitlerUtility.h"
+#include "support/ConfinedPath.h"
 #include "touchui/CustomTreeDelegete.h"
 #include "touchui/KSPushbutton.h"
 #include "touchui/KSTreeModel.h"
 #include "touchui/KSTreeView.h"
 #include "touchui/WindowPlaceKeeper.h"
 
+#include <QFileInfo>
 #include <QHeaderView>
 #include <QKeyEvent>
 #include <QLabel>
@@ -280,7 +282,8 @@ void FolderPicker::updateThumbnailArea(const QString& path)
     const std::string title = path.toStdString();
     const std::string name = TitlerUtility::getThumbnailNameFromTitlePath(
         title, TitleFileOperations::THUMBNAIL_SMALL.toStdString());
-    initThumbnailArea(QString::fromStdString(TitlerUtility::getThumbnailPathFromTitlePath(title, name)));
+    initThumbnailArea(QString::fromStdString(ConfinedPath::namedByTitle(
+        QFileInfo(path).path().toStdString(), TitlerUtility::getThumbnailPathFromTitlePath(title, name))));
 }
 
 void FolderPicker::clearThumbnailArea()

@@ -131,7 +131,7 @@ bool FolderPicker::checkCanCreateNew(const QModelIndex& index) const
 bool FolderPicker::isVanished(const QModelIndex& index)
 {
     const QString name = nameOf(folderOf(index));
-    if (!index.isValid() || QFileInfo(folderPath(name)).isDir())
+    if (!index.isValid() || mController.isTitleFolder(mRootPath, name))
         return false;
     slotDeleteFolder(name.toStdWString());
     return true;

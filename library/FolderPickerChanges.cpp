@@ -3,6 +3,7 @@
 #include "library/FolderNameRules.h"
 #include "library/FolderPicker.h"
 #include "library/FolderPickerFactory.h"
+#include "support/ConfinedPath.h"
 #include "touchui/KSInputContext.h"
 #include "touchui/KSModelAttributeItem.h"
 #include "touchui/KSPushbutton.h"
@@ -65,6 +66,11 @@ void FolderPicker::folderNameChanged(FileManagerDefine::tagChangeFolderNameParam
     if (!FolderNameRules::isFolderName(before) || !FolderNameRules::isFolderName(after))
         return;
     regetRootPath();
+    if (!mController.staysBelow(mRootPath, after)) {
+        ConfinedPath::logRefusal(L"a folder is said to be called like a link: ",
+                                 folderPath(after).toStdString());
+        return;
+    }
     if (isNameOf(before, mCurrentFolderName)) {
         mCurrentFolderName = after;
         Q_EMIT folderNameChange(folderPath(before), folderPath(after));

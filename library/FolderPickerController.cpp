@@ -1,6 +1,7 @@
 #include "library/FolderPickerController.h"
 
 #include "library/FolderNameRules.h"
+#include "support/ConfinedPath.h"
 #include "support/FolderLookup.h"
 #include "support/IPathManagerEx.h"
 #include "support/SystemInfo.h"
@@ -11,6 +12,16 @@ bool FolderPickerController::isNullDirectory(const QFileInfo& folder) const
            QDir(folder.filePath())
                .entryList(QDir::AllEntries | QDir::Hidden | QDir::System | QDir::NoDotAndDotDot)
                .isEmpty();
+}
+
+bool FolderPickerController::isTitleFolder(const QString& root, const QString& name) const
+{
+    return QFileInfo(root + QLatin1Char('/') + name).isDir() && staysBelow(root, name);
+}
+
+bool FolderPickerController::staysBelow(const QString& root, const QString& name) const
+{
+    return ConfinedPath::isBelow(root.toStdString(), (root + QLatin1Char('/') + name).toStdString());
 }
 
 QString FolderPickerController::getTitlerRootFolder() const

@@ -15,6 +15,10 @@ public:
 
     // No folder, one that cannot be read, or one without entries.
     bool isNullDirectory(const QFileInfo& folder) const;
+    // Whether there is such a folder, and not by a link to a place outside of the root.
+    bool isTitleFolder(const QString& root, const QString& name) const;
+    // Whether a folder of this name, which need not exist, would be below the root with all links resolved.
+    bool staysBelow(const QString& root, const QString& name) const;
     // Without a slash at its end.
     QString getTitlerRootFolder() const;
     // All that a folder holds, with its order. Files that cannot be read are left out, and the result false.

@@ -4,6 +4,7 @@
 #include "document/ArchiveOrder.h"
 #include "library/FolderEditor.h"
 #include "library/FolderNameRules.h"
+#include "support/ConfinedPath.h"
 #include "touchui/KSModelAttributeItem.h"
 #include "touchui/KSVIEW.h"
 
@@ -70,8 +71,10 @@ void FolderPickerFactory::importSourceData()
         return;
     const QStringList names =
         QDir(mRootPath).entryList(QDir::Dirs | QDir::NoDotAndDotDot, QDir::Name | QDir::IgnoreCase);
-    for (const QString& name : names)
-        mFolders.append(folderOf(takeFolder(name)));
+    for (const QString& name : names) {
+        if (mDisk.isTitleFolder(mRootPath, name))
+            mFolders.append(folderOf(takeFolder(name)));
+    }
 }
 
 void* FolderPickerFactory::takeFolder(const QString& name)
@@ -122,7 +125,7 @@ QList<QFileInfo> FolderPickerFactory::getTitlerFiles(int, const QString& path)
         if (!FolderNameRules::isFolderName(name) || !QDir::match(QStringLiteral("*.xml"), name))
             continue;
         const QFileInfo info(path + QLatin1Char('/') + name);
-        if (info.isFile())
+        if (info.isFile() && !ConfinedPath::namedByOrder(path.toStdString(), name.toStdString()).empty())
             titles.append(info);
         if (titles.size() >= static_cast<qsizetype>(TITLE_MASK) - 1)
             break;

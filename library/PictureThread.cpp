@@ -5,6 +5,7 @@
 #include "document/ImageResizer.h"
 #include "document/PngWriter.h"
 #include "library/TitlerUtility.h"
+#include "support/AlternateStack.h"
 
 #include <QFile>
 #include <QMutexLocker>
@@ -60,6 +61,7 @@ bool PictureThread::isThreadWaiting() const
 
 void PictureThread::run()
 {
+    AlternateStack::useInThisThread();
     for (;;) {
         Job job;
         {

@@ -1,6 +1,7 @@
 #include "library/SceneThread.h"
 
 #include "document/Archive.h"
+#include "support/AlternateStack.h"
 
 #include <QMutexLocker>
 
@@ -32,6 +33,7 @@ void SceneThread::addArchive(const Archive* archive)
 
 void SceneThread::run()
 {
+    AlternateStack::useInThisThread();
     for (;;) {
         std::unique_ptr<Archive> archive;
         {

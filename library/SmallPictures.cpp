@@ -1,7 +1,6 @@
 #include "library/SmallPictures.h"
 
-#include <QFileInfo>
-#include <QImageReader>
+#include "document/PictureReader.h"
 
 SmallPictures::SmallPictures(const QStringList& paths, QSize bounds)
     : mBounds(bounds), mPictures(static_cast<std::size_t>(paths.size()))
@@ -46,9 +45,7 @@ QImage SmallPictures::take(qsizetype index)
 
 QImage SmallPictures::read(const QString& path, QSize bounds)
 {
-    if (!QFileInfo(path).isFile()) // a pipe would be waited for
-        return {};
-    return fitted(QImageReader(path).read(), bounds);
+    return fitted(PictureReader::read(path), bounds);
 }
 
 // A picture of foreign making may be of any size; what does not fit would only cost memory.

@@ -6,6 +6,7 @@
 #include "library/TemplateScrollArea.h"
 #include "library/TemplateTab.h"
 #include "library/TitlerTabWidget.h"
+#include "support/ConfinedPath.h"
 #include "support/LogManager.h"
 #include "touchui/KSPushbutton.h"
 
@@ -201,6 +202,10 @@ void TemplatePicker::slotSaveAsTemplate(QString name)
 
 void TemplatePicker::slotImportNewUserTemplate(QString name)
 {
+    if (!mUserController.isTemplatePath(name)) {
+        ConfinedPath::logRefusal(L"a new template is said to be in: ", name.toStdString());
+        return;
+    }
     if (name.contains(QLatin1Char('/')))
         name = QFileInfo(name).isDir() ? lastPartOf(name) : templateNameIn(*mUserTab, name);
     const int id = findTemplateIdFromName(name);
@@ -227,8 +232,12 @@ void TemplatePicker::slotRenameUserTemplate(QString oldName, QString newName, QS
                     L"\" is not found. cannot rename to \"" + newName.toStdWString() + L"\".");
         return;
     }
-    Archive* archive = mUserTab->archive(id);
     const QString folder = lastPartOf(path) == newName ? QDir::cleanPath(path) : folderOf(path);
+    if (!mUserController.isTemplatePath(folder)) {
+        ConfinedPath::logRefusal(L"a template is said to be in: ", path.toStdString());
+        return;
+    }
+    Archive* archive = mUserTab->archive(id);
     archive->setName((newName + QStringLiteral("/Titler")).toStdString());
     archive->setPath((folder + QStringLiteral("/Titler.xml")).toStdString());
     TemplateItem* item = mUserTab->item(id);
@@ -243,7 +252,7 @@ void TemplatePicker::slotRenameUserTemplate(QString oldName, QString newName, QS
 void TemplatePicker::slotDeleteUserTemplate(QString path)
 {
     const QString name = templateNameIn(*mUserTab, path);
-    const int id = findTemplateIdFromName(name);
+    const int id = mUserController.isTemplatePath(path) ? findTemplateIdFromName(name) : -1;
     if (id == -1) {
         logNotFound(L"slotDeleteUserTemplate() \"" + name.toStdWString() + L"(" + path.toStdWString() +
                     L")\" is not found.");

@@ -1,20 +1,17 @@
 #include "library/TemplateThumbnail.h"
 
-#include <QFileInfo>
-#include <QImageReader>
+#include "document/PictureReader.h"
+
 #include <QPainter>
 
 QImage TemplateThumbnail::read(const QString& path)
 {
-    if (!QFileInfo(path).isFile()) // a pipe would be waited for
-        return {};
-    QImageReader reader(path);
+    const PictureReader reader(path);
     const QSize size = reader.size();
     if (size.isEmpty() || qint64(size.width()) * size.height() > PIXEL_LIMIT)
         return {};
-    if (size.width() > SIZE.width() || size.height() > SIZE.height())
-        reader.setScaledSize(size.scaled(SIZE, Qt::KeepAspectRatio).expandedTo(QSize(1, 1)));
-    return reader.read();
+    const bool fits = size.width() <= SIZE.width() && size.height() <= SIZE.height();
+    return reader.read(fits ? QSize() : size.scaled(SIZE, Qt::KeepAspectRatio).expandedTo(QSize(1, 1)));
 }
 
 QImage TemplateThumbnail::onChecker(const QImage& picture)

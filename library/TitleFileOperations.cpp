@@ -4,6 +4,7 @@
 #include "document/ArchiveController.h"
 #include "library/TitlerUtility.h"
 #include "support/AtomicFile.h"
+#include "support/ConfinedPath.h"
 #include "support/LogManager.h"
 #include "support/SystemInfo.h"
 
@@ -37,19 +38,22 @@ QByteArray readPicture(const QString& path)
     return QByteArray::fromStdString(bytes);
 }
 
+// Empty for a name that leads to where no titles and templates are.
 QString pictureOf(const Archive& archive, const std::string& name)
 {
     if (name.empty())
         return {};
-    return QString::fromStdString(TitlerUtility::getThumbnailPathFromTitlePath(archive.getPath(), name));
+    const std::string folder = QFileInfo(QString::fromStdString(archive.getPath())).path().toStdString();
+    return QString::fromStdString(ConfinedPath::namedByTitle(
+        folder, TitlerUtility::getThumbnailPathFromTitlePath(archive.getPath(), name)));
 }
 
 void writePicture(const Archive& archive, const std::string& name, const QByteArray& bytes)
 {
     if (!name.empty() && !bytes.isEmpty())
-        AtomicFile::write(pictureOf(archive, name).toStdString(),
+        AtomicFile::write(TitlerUtility::getThumbnailPathFromTitlePath(archive.getPath(), name),
                           {bytes.constData(), static_cast<std::size_t>(bytes.size())},
-                          AtomicFile::Durability::SyncLater);
+                          AtomicFile::Durability::SyncLater, AtomicFile::Links::Replace);
 }
 
 void writePictures(const Archive& archive, const TitlePictures& pictures)

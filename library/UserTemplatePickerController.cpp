@@ -55,6 +55,11 @@ int UserTemplatePickerController::reCreateNewOrderXml()
     return UserTemplateManager::getInstance()->reCreateNewOrderXml();
 }
 
+bool UserTemplatePickerController::isTemplatePath(const QString& path) const
+{
+    return UserTemplateManager::getInstance()->isTemplatePath(path.toStdString());
+}
+
 int UserTemplatePickerController::deleteTemplate(std::string path)
 {
     const int result = UserTemplateManager::getInstance()->deleteTemplatePath(path);

@@ -4,6 +4,7 @@
 
 #include "library/ITemplateSource.h"
 
+#include <QString>
 #include <QVector>
 
 class Archive;
@@ -23,6 +24,7 @@ public:
     int createNewTemplateXml(std::string name, Archive* archive);
     int renameInOrderXml(std::string oldName, std::string newName);
     int reCreateNewOrderXml();
+    bool isTemplatePath(const QString& path) const;
 
     // Deletes the template with this title file and reports it. 0 when the title file stayed.
     int deleteTemplate(std::string path);

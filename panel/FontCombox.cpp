@@ -3,6 +3,7 @@
 #include "document/SettingManager.h"
 #include "panel/FontFamilyDelegate.h"
 #include "panel/TextToolsPanelController.h"
+#include "support/ConfinedPath.h"
 
 #include <QDir>
 #include <QFileInfo>
@@ -114,12 +115,17 @@ void FontCombox::addSpecialDefaultFont()
         m_imported.append(family);
 }
 
-// A pipe would block and a monster would fill the memory; the font system refuses what is no font.
+// A pipe would block and a monster would fill the memory; the font system refuses what is no font. Notices
+// name files of the folder.
 void FontCombox::registerFontFile(const QString& path)
 {
     const QFileInfo info(path);
     if (!info.isFile() || info.size() > LARGEST_FONT_FILE)
         return;
+    if (!ConfinedPath::isBelow(m_importFolder.toStdString(), path.toStdString())) {
+        ConfinedPath::logRefusal(L"a font is said to be in: ", path.toStdString());
+        return;
+    }
     const int id = QFontDatabase::addApplicationFont(path);
     if (id < 0)
         return;

@@ -1,8 +1,8 @@
 #include "panel/TextToolsPanelController.h"
 
 #include "document/SettingManager.h"
+#include "support/LogManager.h"
 
-#include <QDebug>
 #include <QFontDatabase>
 
 QStringList TextToolsPanelController::getFontLib() const
@@ -14,7 +14,7 @@ FontStyle TextToolsPanelController::getLastTextStyle() const
 {
     FontStyle style;
     if (SettingManager().loadLastTextParameter(&style) == 0)
-        qDebug("read xml file failed");
+        LOG_DEBUG_OPERATE(L"TextToolsPanelController", 200, L"read xml file failed");
     return style;
 }
 

@@ -23,7 +23,8 @@ def parse(arguments):
                                      formatter_class=argparse.RawDescriptionHelpFormatter)
     parser.add_argument("--keep", action="store_true", help="stay up without a display, too")
     parser.add_argument("--build", default=os.path.join(session.ROOT, "build"), help="the build tree")
-    parser.add_argument("--title", help="the title file or folder to open; a sample title by default")
+    parser.add_argument("--title",
+                        help="the title file or folder to open, below the titles of the data path; a sample by default")
     return parser.parse_args(arguments)
 
 
@@ -48,15 +49,17 @@ def provision(build, environment):
 
 
 def sample_title(base):
-    """The first title of the first folder that has one."""
+    """The first title of the first folder that has one; else an empty folder, in which a title is begun."""
     titles = os.path.join(base, "resources", "Titles")
+    welcome = os.path.join(titles, "Welcome")
+    os.makedirs(welcome, exist_ok=True)
     for folder in ["Welcome", *sorted(os.listdir(titles))]:
         path = os.path.join(titles, folder)
         if os.path.isdir(path):
             names = sorted(name for name in os.listdir(path) if name.endswith(".xml") and not name.startswith("."))
             if names:
                 return os.path.join(path, names[0])
-    return titles
+    return welcome
 
 
 def forward_input(appliance):

@@ -2,6 +2,7 @@
 
 #include "support/FileSyncQueue.h"
 #include "support/HiddenName.h"
+#include "support/OwnerOnlyFiles.h"
 
 #include <cerrno>
 #include <climits>
@@ -84,7 +85,7 @@ struct Target {
     bool exists = false;
 };
 
-bool resolve(const std::string& path, Target& target)
+bool resolve(const std::string& path, AtomicFile::Links links, Target& target)
 {
     if (path.empty() || path.find('\0') != std::string::npos)
         return false;
@@ -94,6 +95,10 @@ bool resolve(const std::string& path, Target& target)
     target.exists = true;
     if (!S_ISLNK(target.status.st_mode))
         return true;
+    if (links == AtomicFile::Links::Replace) {
+        target.exists = false; // what the link leads to is not the target
+        return true;
+    }
     char resolved[PATH_MAX];
     if (!::realpath(path.c_str(), resolved))
         return false;
@@ -107,7 +112,8 @@ Descriptor openTemporary(const Target& target, std::string& name)
     int descriptor = -1;
     do {
         name = HiddenName::temporary(folder);
-        descriptor = ::open(name.c_str(), O_WRONLY | O_CREAT | O_EXCL | O_CLOEXEC, 0666);
+        descriptor =
+            ::open(name.c_str(), O_WRONLY | O_CREAT | O_EXCL | O_CLOEXEC, 0666 & ~OwnerOnlyFiles::REFUSED);
     } while (descriptor < 0 && (errno == EEXIST || errno == EINTR));
     if (descriptor >= 0 && target.exists) {
         if (target.status.st_uid != ::geteuid() || target.status.st_gid != ::getegid()) {
@@ -115,17 +121,18 @@ Descriptor openTemporary(const Target& target, std::string& name)
             if (::fchown(descriptor, target.status.st_uid, target.status.st_gid) != 0)
                 errno = 0;
         }
-        ::fchmod(descriptor, target.status.st_mode & 07777);
+        ::fchmod(descriptor, target.status.st_mode & 07777 & ~OwnerOnlyFiles::REFUSED);
     }
     return Descriptor(descriptor);
 }
 
 // Makes the new file by fill(descriptor) and puts it in the place of the old one.
 template <typename Fill>
-bool replaceFile(const std::string& path, AtomicFile::Durability durability, Fill fill)
+bool replaceFile(const std::string& path, AtomicFile::Durability durability, AtomicFile::Links links,
+                 Fill fill)
 {
     Target target;
-    if (!resolve(path, target))
+    if (!resolve(path, links, target))
         return false;
     if (target.exists) {
         if (S_ISDIR(target.status.st_mode))
@@ -160,9 +167,10 @@ bool replaceFile(const std::string& path, AtomicFile::Durability durability, Fil
 
 } // namespace
 
-bool AtomicFile::write(const std::string& path, std::string_view bytes, Durability durability)
+bool AtomicFile::write(const std::string& path, std::string_view bytes, Durability durability, Links links)
 {
-    return replaceFile(path, durability, [bytes](int descriptor) { return writeAll(descriptor, bytes); });
+    return replaceFile(path, durability, links,
+                       [bytes](int descriptor) { return writeAll(descriptor, bytes); });
 }
 
 bool AtomicFile::copy(const std::string& source, const std::string& target, Durability durability)
@@ -171,7 +179,7 @@ bool AtomicFile::copy(const std::string& source, const std::string& target, Dura
     struct stat status = {};
     if (!from.isOpen() || ::fstat(from.get(), &status) != 0 || !S_ISREG(status.st_mode))
         return false;
-    return replaceFile(target, durability,
+    return replaceFile(target, durability, Links::Replace,
                        [&from](int descriptor) { return copyAll(from.get(), descriptor); });
 }
 

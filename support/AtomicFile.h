@@ -20,13 +20,19 @@ public:
         SyncLater, // brought to the disk by the background thread
     };
 
+    // What a symbolic link at the path of a write means.
+    enum class Links {
+        Follow,  // the file that it leads to is written
+        Replace, // a file takes its place; what it leads to is left alone
+    };
+
     // Replaces the file at path, or makes it. False, with the old file untouched, when that cannot be done:
     // the disk is full, the folder is missing or read-only, the file itself is not writable. The permissions
-    // of an existing file stay; a symbolic link is followed. Any thread.
+    // of an existing file stay, but for those to write of others than its owner. Any thread.
     static bool write(const std::string& path, std::string_view bytes,
-                      Durability durability = Durability::Automatic);
+                      Durability durability = Durability::Automatic, Links links = Links::Follow);
 
-    // Replaces target by a copy of the file source, as write does.
+    // Replaces target by a copy of the file source, as write does. A link at target is replaced.
     static bool copy(const std::string& source, const std::string& target,
                      Durability durability = Durability::Automatic);
 

@@ -1,5 +1,6 @@
 #include "support/FileSyncQueue.h"
 
+#include "support/AlternateStack.h"
 #include "support/HiddenName.h"
 
 #include <cerrno>
@@ -109,6 +110,7 @@ private:
 
     void run()
     {
+        AlternateStack::useInThisThread();
         std::unique_lock lock(mMutex);
         for (;;) {
             mWork.wait(lock, [this] { return !mOrder.empty(); });

@@ -1,14 +1,18 @@
 #include "support/LogManager.h"
 
 #include "support/LocaleText.h"
+#include "support/LogFile.h"
 #include "support/k2sys/k2sys.h"
 
 #include <syslog.h>
 #include <unistd.h>
 
+#include <algorithm>
 #include <climits>
 #include <cstring>
 #include <ctime>
+#include <cwchar>
+#include <iterator>
 
 LogManager* LogManager::mpLogManager = nullptr;
 
@@ -19,6 +23,8 @@ const int LOG_OPTION = LOG_PID;
 const int LOG_FACILITY = LOG_LOCAL0;
 const std::size_t LINE_FORMAT_SIZE = 512;
 const std::size_t EVENT_FORMAT_SIZE = 256;
+const std::size_t TEXT_LIMIT = 2000; // characters
+const std::size_t FORMATTED_LIMIT = 8192;
 
 ILogManager* gLogManager = nullptr;
 std::wstring gProcName;
@@ -30,6 +36,57 @@ std::string logFolder()
         return "/var/log";
     }
     return folder;
+}
+
+bool isControl(char32_t c)
+{
+    return c < 0x20 || (c >= 0x7F && c < 0xA0);
+}
+
+// Line and paragraph separator, and what turns the direction of writing round.
+bool isMisleading(char32_t c)
+{
+    return c == 0x2028 || c == 0x2029 || (c >= 0x202A && c <= 0x202E) || (c >= 0x2066 && c <= 0x2069);
+}
+
+// Texts come from keyboards, files and other processes: none of them may begin a line of its own or steer the
+// terminal on which the log is read.
+std::wstring escaped(const std::wstring& text)
+{
+    std::wstring result;
+    result.reserve(text.size());
+    for (const wchar_t c : text) {
+        const auto code = static_cast<char32_t>(c);
+        wchar_t number[16];
+        if (c == L'\n')
+            result += L"\\n";
+        else if (c == L'\r')
+            result += L"\\r";
+        else if (c == L'\t')
+            result += L"\\t";
+        else if (isControl(code) || isMisleading(code)) {
+            std::swprintf(number, std::size(number), code < 0x100 ? L"\\x%02x" : L"\\u%04x",
+                          static_cast<unsigned>(code));
+            result += number;
+        } else
+            result += c;
+    }
+    return result;
+}
+
+// The text as it goes into a line: escaped, in bytes, and no longer than a line can take.
+std::string lineText(const std::wstring& text)
+{
+    return wideToMultiByte(escaped(text.size() > TEXT_LIMIT ? text.substr(0, TEXT_LIMIT) : text));
+}
+
+// Puts the arguments into the format, up to a limit.
+__attribute__((format(printf, 1, 0))) std::string formatted(const char* format, va_list args)
+{
+    std::string text(FORMATTED_LIMIT, '\0');
+    const int size = std::vsnprintf(text.data(), text.size(), format, args);
+    text.resize(size < 0 ? 0 : std::min(static_cast<std::size_t>(size), text.size() - 1));
+    return text;
 }
 
 // Text that becomes part of a printf format must not be read as conversions.
@@ -121,26 +178,18 @@ void LogManager::clearUp()
 LogManager::LogManager()
 {
     k2sys_init();
-    m_processName = wideToMultiByte(gProcName);
+    m_processName = lineText(gProcName);
     k2sys_openlog(m_processName.c_str(), LOG_OPTION, LOG_FACILITY);
     const std::string folder = logFolder();
-    m_operationFile = std::fopen((folder + "/k2_ope.log").c_str(), "a+e");
-    m_debugFile = std::fopen((folder + "/k2_ope_debug.log").c_str(), "a+e");
+    m_operationFile = std::make_unique<LogFile>(folder + "/k2_ope.log");
+    m_debugFile = std::make_unique<LogFile>(folder + "/k2_ope_debug.log");
 }
 
-LogManager::~LogManager()
-{
-    for (FILE* file : {m_operationFile, m_debugFile, m_thirdFile}) {
-        if (file != nullptr) {
-            std::fclose(file);
-        }
-    }
-}
+LogManager::~LogManager() = default;
 
 void LogManager::logEvent(std::wstring module, int line, std::wstring text, int priority)
 {
-    k2sys_syslog(priority, "%s %03d: %s", wideToMultiByte(module).c_str(), line,
-                 wideToMultiByte(text).c_str());
+    k2sys_syslog(priority, "%s %03d: %s", lineText(module).c_str(), line, lineText(text).c_str());
 }
 
 void LogManager::logEvent(int priority, const char* module, int line, const char* format, va_list args)
@@ -148,7 +197,8 @@ void LogManager::logEvent(int priority, const char* module, int line, const char
     char number[16];
     std::snprintf(number, sizeof number, " %03d: ", line);
     const std::string whole = withoutConversions(module) + number + format;
-    k2sys_vsyslog(priority, cutFormat(whole, EVENT_FORMAT_SIZE).c_str(), args);
+    const std::string text = formatted(cutFormat(whole, EVENT_FORMAT_SIZE).c_str(), args);
+    k2sys_syslog(priority, "%s", lineText(multiByteToWide(text)).c_str());
 }
 
 void LogManager::putLog(FILE* file, const char* module, int line, const char* format, va_list args)
@@ -161,32 +211,28 @@ void LogManager::putLog(FILE* file, const char* module, int line, const char* fo
     const std::string whole = getCurrentTime() + " localhost " + withoutConversions(m_processName) + "[" +
                               std::to_string(getpid()) + "]: [" + withoutConversions(module) + number +
                               format;
-    // One byte is kept back so that a line that is cut still ends.
-    const std::string cut = cutFormat(whole, LINE_FORMAT_SIZE - 1) + "\n";
-    if (std::vfprintf(file, cut.c_str(), args) >= 0) {
+    const std::string text = formatted(cutFormat(whole, LINE_FORMAT_SIZE - 1).c_str(), args);
+    if (std::fprintf(file, "%s\n", lineText(multiByteToWide(text)).c_str()) >= 0) {
         std::fflush(file);
     }
 }
 
 void LogManager::logUserOperate(std::wstring area, int line, std::wstring text)
 {
-    writeLine(m_operationFile, area, line, text);
+    writeLine(*m_operationFile, area, line, text);
 }
 
 void LogManager::logDebugOperate(std::wstring area, int line, std::wstring text)
 {
-    writeLine(m_debugFile, area, line, text);
+    writeLine(*m_debugFile, area, line, text);
 }
 
-void LogManager::writeLine(FILE* file, const std::wstring& area, int number, const std::wstring& text)
+void LogManager::writeLine(LogFile& file, const std::wstring& area, int number, const std::wstring& text)
 {
-    if (file == nullptr) {
-        return;
-    }
-    std::fprintf(file, "%s localhost %s[%d]: [%s] %03d: %s\n", getCurrentTime().c_str(),
-                 m_processName.c_str(), static_cast<int>(getpid()), wideToMultiByte(area).c_str(), number,
-                 wideToMultiByte(text).c_str());
-    std::fflush(file);
+    char code[16];
+    std::snprintf(code, sizeof code, "%03d", number);
+    file.write(getCurrentTime() + " localhost " + m_processName + '[' + std::to_string(getpid()) + "]: [" +
+               lineText(area) + "] " + code + ": " + lineText(text) + '\n');
 }
 
 std::string LogManager::getCurrentTime()

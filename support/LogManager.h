@@ -1,5 +1,6 @@
 // The trace of what the operator did: two text files that the appliance's processes share, and the system
-// log.
+// log. A text is one line of at most 2,000 characters: control characters in it are written as "\n", "\x1b"
+// and the like, and the rest is cut.
 //
 // The free functions below are the only way in. Before INIT_LOGGING and after UNINIT_LOGGING they do nothing.
 // INIT_LOGGING and UNINIT_LOGGING belong to the GUI thread; the others may be called from any thread between
@@ -10,7 +11,10 @@
 
 #include <sys/time.h>
 
+#include <memory>
 #include <string>
+
+class LogFile;
 
 // Starts logging under a process tag.
 void INIT_LOGGING(std::wstring processTag);
@@ -46,11 +50,10 @@ public:
 private:
     LogManager();
     ~LogManager() override;
-    void writeLine(FILE* file, const std::wstring& area, int number, const std::wstring& text);
+    void writeLine(LogFile& file, const std::wstring& area, int number, const std::wstring& text);
 
     static LogManager* mpLogManager;
-    FILE* m_operationFile = nullptr;
-    FILE* m_debugFile = nullptr;
-    FILE* m_thirdFile = nullptr; // never opened
-    std::string m_processName;
+    std::unique_ptr<LogFile> m_operationFile;
+    std::unique_ptr<LogFile> m_debugFile;
+    std::string m_processName; // as it stands in a line
 };

@@ -58,6 +58,16 @@ long long folderBytes(const fs::path& folder)
     return sum;
 }
 
+// Whether path is folder or lies below it.
+bool isWithin(const fs::path& folder, const fs::path& path)
+{
+    boost::system::error_code error;
+    const fs::path outer = fs::weakly_canonical(folder, error);
+    const fs::path inner = fs::weakly_canonical(path, error);
+    const auto mismatch = std::mismatch(outer.begin(), outer.end(), inner.begin(), inner.end());
+    return mismatch.first == outer.end();
+}
+
 bool copyContents(const fs::path& source, const fs::path& target)
 {
     boost::system::error_code error;
@@ -70,20 +80,12 @@ bool copyContents(const fs::path& source, const fs::path& target)
         entries.push_back(entry->path());
     bool isDone = !error;
     for (const fs::path& entry : entries) {
-        if (isContent(entry) && entry != target)
+        // What a link brings in from elsewhere is no content of the folder.
+        const bool isForeign = fs::is_symlink(entry, error) && !isWithin(source, entry);
+        if (isContent(entry) && entry != target && !isForeign)
             isDone = SystemInfo::copyFile(entry, target / entry.filename()) && isDone;
     }
     return isDone;
-}
-
-// Whether path is folder or lies below it.
-bool isWithin(const fs::path& folder, const fs::path& path)
-{
-    boost::system::error_code error;
-    const fs::path outer = fs::weakly_canonical(folder, error);
-    const fs::path inner = fs::weakly_canonical(path, error);
-    const auto mismatch = std::mismatch(outer.begin(), outer.end(), inner.begin(), inner.end());
-    return mismatch.first == outer.end();
 }
 
 } // namespace

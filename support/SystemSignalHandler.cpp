@@ -1,5 +1,6 @@
 #include "support/SystemSignalHandler.h"
 
+#include "support/AlternateStack.h"
 #include "support/k2sys/k2sys.h"
 
 #include <QCoreApplication>
@@ -37,11 +38,13 @@ const SignalText SIGNALS[] = {
     {SIGPWR, "Power Button Pressed"},
     {SIGUSR1, ""},
     {SIGUSR2, "User Defined Signal #2"},
+    {SIGABRT, "Aborted"},
     {0, nullptr},
 };
 
 const int TABLE_ENTRIES = 65;
 const int LAST_HANDLED_SIGNAL = 15;
+const unsigned TRACE_SECONDS = 10;
 const std::size_t TABLE_BYTES = TABLE_ENTRIES * sizeof(const char*);
 
 std::atomic<void (*)()> g_pCallBackFun{nullptr};
@@ -114,14 +117,56 @@ void requestTermination()
     errno = savedError;
 }
 
-void traceAndAbort()
+// From here on down to handleSignal, only what may be called in a signal handler is called: the fault may
+// have come with any lock held and the heap in any state.
+
+void setDefaultAction(int number)
 {
+    struct sigaction action {
+    };
+    action.sa_handler = SIG_DFL;
+    sigemptyset(&action.sa_mask);
+    sigaction(number, &action, nullptr);
+}
+
+// A trace that waits for a lock of the thread that it stopped ends the process all the same.
+void limitTraceTime()
+{
+    setDefaultAction(SIGALRM);
+    sigset_t alarmOnly;
+    sigemptyset(&alarmOnly);
+    sigaddset(&alarmOnly, SIGALRM);
+    pthread_sigmask(SIG_UNBLOCK, &alarmOnly, nullptr);
+    alarm(TRACE_SECONDS);
+}
+
+void trace()
+{
+    limitTraceTime();
     k2sys_print_backtrace();
     if (const char** table = g_SignalMsgTable.exchange(nullptr)) {
         munmap(table, TABLE_BYTES);
     }
     g_bIsInited.store(false);
+}
+
+void traceAndAbort()
+{
+    trace();
+    struct sigaction action {
+    };
+    if (sigaction(SIGABRT, nullptr, &action) == 0 && action.sa_handler == handleSignal) {
+        setDefaultAction(SIGABRT); // one trace is enough
+    }
     std::abort();
+}
+
+// The signal ends the process when the handler returns.
+void traceAndEnd(int number)
+{
+    trace();
+    setDefaultAction(number);
+    raise(number);
 }
 
 } // namespace
@@ -131,6 +176,7 @@ void registerSystemSignalHandler(void (*callback)(), char const* processName)
     g_pCallBackFun.store(callback);
     g_strProcessName = processName != nullptr ? processName : "";
     createWakeUpPipe();
+    AlternateStack::useInThisThread();
     if (g_bIsInited.load()) {
         return;
     }
@@ -148,7 +194,7 @@ void registerSystemSignalHandler(void (*callback)(), char const* processName)
         };
         action.sa_handler = handleSignal;
         sigemptyset(&action.sa_mask);
-        action.sa_flags = 0;
+        action.sa_flags = SA_ONSTACK;
         sigaction(entry->number, &action, nullptr);
     }
     g_bIsInited.store(true);
@@ -165,6 +211,9 @@ void handleSignal(int signalNumber)
     case SIGFPE:
     case SIGSEGV:
         traceAndAbort();
+        break;
+    case SIGABRT:
+        traceAndEnd(signalNumber);
         break;
     case SIGINT:
     case SIGTERM:

@@ -1,9 +1,12 @@
-// What the process does on signals: faults leave a stack trace and abort, termination requests call back.
+// What the process does on signals: faults and aborts leave a stack trace and end it, termination requests
+// call back.
 #pragma once
 
-// Installs the handler of the eleven signals. callback is called on SIGTERM and SIGINT: from the event loop
-// of the thread that registered when a QCoreApplication exists there, and from within the signal handler
-// otherwise. Null is allowed. A second call replaces callback and name. Call from the GUI thread.
+// Installs the handler of the twelve signals, and a stack for it in the calling thread; other threads that
+// want a trace also when their stack is full take one with AlternateStack. callback is called on SIGTERM and
+// SIGINT: from the event loop of the thread that registered when a QCoreApplication exists there, and from
+// within the signal handler otherwise. Null is allowed. A second call replaces callback and name. Call from
+// the GUI thread.
 void registerSystemSignalHandler(void (*callback)(), char const* processName);
 
 // The handler itself.

@@ -1,4 +1,6 @@
 // The main window against siblings that only listen: layout, requests, closing, masks, move mode, language.
+#include "../library/LibraryFixture.h"
+#include "../support/LogFixture.h"
 #include "Siblings.h"
 #include "app/APPEventFilter.h"
 #include "app/EditContextController.h"
@@ -14,6 +16,7 @@
 #include "document/Archive.h"
 #include "document/ArchiveController.h"
 #include "document/ArchiveOrder.h"
+#include "document/CanvasController.h"
 #include "document/TText.h"
 #include "document/TextStyle.h"
 #include "document/TitleParser.h"
@@ -26,11 +29,12 @@
 #include <QAction>
 #include <QApplication>
 #include <QDir>
+#include <QFile>
+#include <QFileInfo>
 #include <QLabel>
 #include <QPointer>
 #include <QPointingDevice>
 #include <QSignalSpy>
-#include <QTemporaryDir>
 #include <QTest>
 #include <QWindow>
 
@@ -58,6 +62,8 @@ private Q_SLOTS:
     void fileRequestShowsTheTitle();
     void secondRequestIsDropped();
     void missingPathHidesAgain();
+    void pathsOutsideHideAgain_data();
+    void pathsOutsideHideAgain();
     void closeHidesAndEmpties();
     void closeWithNewFilesAsksFirst();
     void closeWhileFingersRestOnTitles();
@@ -66,6 +72,10 @@ private Q_SLOTS:
     void focusCommandLeavesACleanStackClean();
     void moveModeEatsPressesOutsideTheList();
     void masksOnlyWhileVisible();
+    void masksGoWithTheWindow_data();
+    void masksGoWithTheWindow();
+    void theKeyboardLearnsTheWindowAtClose();
+    void debugLinesGoToTheDebugLog();
     void missingFontIsReportedOnShow();
     void windowManagerCloseKeepsTheProcess();
     void languageFallsBackToEnglish();
@@ -77,8 +87,9 @@ private:
     ArchiveList* list() const { return mWindow->findChild<ArchiveList*>(); }
     CanvasScene* scene() const { return mWindow->findChild<CanvasScene*>(); }
 
-    QTemporaryDir mData;
+    LibraryFixture mFiles;
     Siblings mSiblings;
+    LogFixture mLog;
     TitlerWindow* mWindow = nullptr;
 };
 
@@ -136,8 +147,7 @@ QString tst_titler_window::writeTitle(const QString& folder, const QString& stem
 
 QString tst_titler_window::writeFolder(const QString& name, const QStringList& stems)
 {
-    const QString folder = mData.filePath(name);
-    QDir().mkpath(folder);
+    const QString folder = mFiles.makeFolder(name);
     QList<ArchiveOrder*> rows;
     for (const QString& stem : stems) {
         writeTitle(folder, stem);
@@ -198,8 +208,52 @@ void tst_titler_window::secondRequestIsDropped()
 
 void tst_titler_window::missingPathHidesAgain()
 {
-    request(mData.filePath("nowhere"));
+    request(mFiles.titleRoot() + "/nowhere");
     QVERIFY(!mWindow->isVisible());
+}
+
+void tst_titler_window::pathsOutsideHideAgain_data()
+{
+    QTest::addColumn<QString>("path");
+    QTest::newRow("folder") << "%1/elsewhere/foreign";
+    QTest::newRow("title") << "%1/elsewhere/foreign/t2.xml";
+    QTest::newRow("climbing folder") << "%2/news/../../../elsewhere/foreign";
+    QTest::newRow("climbing title") << "%2/news/../../../elsewhere/foreign/t2.xml";
+    QTest::newRow("linked folder") << "%2/link";
+    QTest::newRow("title in a linked folder") << "%2/link/t2.xml";
+    QTest::newRow("linked title") << "%2/news/link.xml";
+    QTest::newRow("link to a title of ours") << "%1/elsewhere/ours.xml";
+    QTest::newRow("root") << "%2";
+    QTest::newRow("beside the root") << "%2 2/foreign";
+    QTest::newRow("relative") << "titles/news";
+}
+
+void tst_titler_window::pathsOutsideHideAgain()
+{
+    QFETCH(QString, path);
+    const QString data = QFileInfo(QFileInfo(mFiles.titleRoot()).path()).path();
+    writeFolder("news", {"t1"});
+    for (const QString& folder : {data + "/elsewhere/foreign", mFiles.titleRoot() + " 2/foreign"}) {
+        QDir(folder).removeRecursively();
+        QVERIFY(QDir().mkpath(folder));
+        for (const char* stem : {"t1", "t2", "t3"})
+            writeTitle(folder, stem);
+        LibraryFixture::writeOrder(folder, {"t1"}); // the others would be cleaned up at Close
+    }
+    QFile::remove(mFiles.titleRoot() + "/link");
+    QVERIFY(QFile::link(data + "/elsewhere/foreign", mFiles.titleRoot() + "/link"));
+    QFile::remove(mFiles.titleRoot() + "/news/link.xml");
+    QVERIFY(QFile::link(data + "/elsewhere/foreign/t2.xml", mFiles.titleRoot() + "/news/link.xml"));
+    QFile::remove(data + "/elsewhere/ours.xml");
+    QVERIFY(QFile::link(mFiles.titleRoot() + "/news/t1.xml", data + "/elsewhere/ours.xml"));
+    mLog.takeDebugLines();
+    request(path.replace("%1", data).replace("%2", mFiles.titleRoot()));
+    QVERIFY(!mWindow->isVisible());
+    QVERIFY(list()->getCurrentPath().isEmpty());
+    QCOMPARE(mLog.takeDebugLines("ConfinedPath"),
+             QStringList("400: Refused, a request asks for what lies outside: " + path));
+    QCOMPARE(QDir(data + "/elsewhere/foreign").entryList({"*.xml"}, QDir::Files).size(), 3);
+    QFile::remove(mFiles.titleRoot() + "/link");
 }
 
 void tst_titler_window::closeHidesAndEmpties()
@@ -353,6 +407,88 @@ void tst_titler_window::moveModeEatsPressesOutsideTheList()
     QVERIFY(!mWindow->archiveListIsMoveMode());
 }
 
+void tst_titler_window::masksGoWithTheWindow_data()
+{
+    QTest::addColumn<bool>("isMessage");
+    QTest::addColumn<bool>("isOffWhileHidden");
+    QTest::newRow("dialog mask") << false << false;
+    QTest::newRow("message mask") << true << false;
+    QTest::newRow("dialog mask, taken away while hidden") << false << true;
+    QTest::newRow("message mask, taken away while hidden") << true << true;
+}
+
+void tst_titler_window::masksGoWithTheWindow()
+{
+    QFETCH(bool, isMessage);
+    QFETCH(bool, isOffWhileHidden);
+    const QString folder = writeFolder("masked", {"t1"});
+    ShowMessageController* messages = ShowMessageController::getInstance();
+    const auto isDark = [this] {
+        for (const QWidget* child : mWindow->findChildren<QWidget*>(QString(), Qt::FindDirectChildrenOnly)) {
+            if (child->geometry() == mWindow->rect() && child->autoFillBackground() && !child->isHidden() &&
+                child->palette().color(QPalette::Window).alpha() == 166)
+                return true;
+        }
+        return false;
+    };
+    request(folder);
+    QVERIFY(!isDark());
+    isMessage ? messages->showMessageOpacityWidget() : messages->showDialogOpacityWidget();
+    QVERIFY(isDark());
+    mWindow->closeTitlerWindow(); // as the answer to a message does while its box is still up
+    QVERIFY(!mWindow->isVisible());
+    if (isOffWhileHidden)
+        isMessage ? messages->hideMessageOpacityWidget() : messages->hideDialogOpacityWidget();
+    QVERIFY(!isDark());
+    request(folder);
+    QVERIFY(!isDark());
+    QVERIFY(mWindow->testAttribute(Qt::WA_AcceptTouchEvents));
+    QMetaObject::invokeMethod(mWindow->findChild<ToolsBar*>(), "closeButtonClick");
+    QVERIFY(!mWindow->isVisible());
+}
+
+void tst_titler_window::theKeyboardLearnsTheWindowAtClose()
+{
+    request(writeFolder("window id", {"t1"}));
+    const QString line = QStringLiteral("200: App Name:%1***WID:%2")
+                             .arg(QCoreApplication::instance()->objectName())
+                             .arg(mWindow->winId());
+    mLog.takeDebugLines();
+    mWindow->closeTitlerWindow();
+    QCOMPARE(mLog.takeDebugLines("KSInputContext").count(line), 1);
+}
+
+void tst_titler_window::debugLinesGoToTheDebugLog()
+{
+    static QStringList printed;
+    printed.clear();
+    const QtMessageHandler before =
+        qInstallMessageHandler([](QtMsgType type, const QMessageLogContext&, const QString& text) {
+            if (type == QtDebugMsg)
+                printed.append(text);
+        });
+    mLog.takeDebugLines();
+    const QString folder = writeFolder("debug lines", {"t1"});
+    Archive archive;
+    archive.setPath((folder + "/saved.xml").toStdString());
+    ArchiveController().saveNewArchive(folder, &archive);
+    CanvasController().saveArchiveChange(folder + "/saved.xml", &archive);
+    ArchiveController().deleteUnusefulArchives(folder);
+    SubCommonDefine::tagFOLDER_TYPE status;
+    status.path = folder.toStdWString();
+    ShowTitlerController::getInstance()->changeFolderStatus(status);
+    qInstallMessageHandler(before);
+    QCOMPARE(printed, QStringList());
+    const QStringList lines = mLog.takeDebugLines();
+    for (const QString& line :
+         {QStringLiteral("[ArchiveController] 200: Save new Archive Success !"),
+          QStringLiteral("[CanvasController] 200: Save Archive Success !"),
+          QStringLiteral("[ArchiveController] 200: Delete XML success"),
+          "[ShowTitlerController] 200: ShowTitlerController_changeFolderStatus() [setFolderStatus()] Path:" +
+              folder})
+        QVERIFY2(lines.contains(line), qPrintable(line + " is not in " + lines.join('\n')));
+}
+
 void tst_titler_window::masksOnlyWhileVisible()
 {
     ShowMessageController* messages = ShowMessageController::getInstance();
@@ -403,7 +539,7 @@ void tst_titler_window::windowManagerCloseKeepsTheProcess()
     mWindow->close();
     QVERIFY(!mWindow->isVisible());
     QCOMPARE(quit.size(), 0);
-    request(mData.filePath("wm"));
+    request(mFiles.titleRoot() + "/wm");
     QVERIFY(mWindow->isVisible());
 }
 

@@ -1,4 +1,5 @@
 // Titles on disk: the archive manager, its facade for the widgets, and the remembered settings.
+#include "../support/LogFixture.h"
 #include "document/Archive.h"
 #include "document/ArchiveController.h"
 #include "document/ArchiveManager.h"
@@ -11,7 +12,6 @@
 #include "document/TText.h"
 #include "support/FileSyncQueue.h"
 #include "support/IPathManagerEx.h"
-#include "support/LogManager.h"
 
 #include <QDir>
 #include <QFile>
@@ -45,14 +45,6 @@ class TestArchives : public QObject
     Q_OBJECT
 
 private Q_SLOTS:
-    void initTestCase()
-    {
-        qputenv("K2SYS_LOG_DIR", mLogs.path().toUtf8());
-        INIT_LOGGING(L"test");
-    }
-
-    void cleanupTestCase() { UNINIT_LOGGING(); }
-
     void init()
     {
         mRoot = std::make_unique<QTemporaryDir>();
@@ -61,6 +53,7 @@ private Q_SLOTS:
         qputenv("K2SYS_AC_ROOT", "");
         QVERIFY(QDir(mRoot->path()).mkpath("defaultuser/titles/新闻 é"));
         write(base("PathInfo.xml"), "<p><TitleResource path=\"titles\"/><SystemSetting path=\"settings\"/>"
+                                    "<Template path=\"templates\"/><TitlerTemplate path=\"usertemplates\"/>"
                                     "<Font path=\"fonts\"/></p>");
         mFolder = base("titles/新闻 é");
     }
@@ -173,6 +166,99 @@ private Q_SLOTS:
         QCOMPARE(entries(), QStringList({".order.xml", "kept.xml", "kept_1920.png", "sub"}));
         QVERIFY(QFile::exists(outside));
         QVERIFY(QFileInfo(file("sub")).isDir());
+    }
+
+    void orderRowsStayInTheirFolder()
+    {
+        makeTitle("kept");
+        QVERIFY(QDir(mRoot->path()).mkpath("elsewhere"));
+        QVERIFY(QFile::copy(file("kept.xml"), mRoot->filePath("elsewhere/foreign.xml")));
+        QVERIFY(QDir(mRoot->path()).mkpath("defaultuser/titles/other"));
+        QVERIFY(QFile::copy(file("kept.xml"), base("titles/other/next.xml")));
+        QVERIFY(QFile::link(mRoot->filePath("elsewhere/foreign.xml"), file("link.xml")));
+        QVERIFY(QFile::link(mRoot->filePath("elsewhere"), file("sub")));
+        QVERIFY(QFile::link(base("titles/other/next.xml"), file("inside.xml")));
+        setOrder({"../../../elsewhere/foreign.xml", "link.xml", "kept.xml", "sub/foreign.xml",
+                  "../other/next.xml", "inside.xml"});
+        const QList<Archive*> titles = ArchiveController().getArchiveList(mFolder);
+        QStringList names;
+        for (const Archive* title : titles)
+            names.append(QString::fromStdString(title->getName()));
+        qDeleteAll(titles);
+        QCOMPARE(names, QStringList({"kept", "inside"}));
+        // A row that is too short for a title takes the other way of reading.
+        setOrder({"x", "../../../elsewhere/foreign.xml", "kept.xml"});
+        const QList<Archive*> others = ArchiveController().getArchiveList(mFolder);
+        QCOMPARE(others.size(), 1);
+        qDeleteAll(others);
+    }
+
+    void picturesStayBelowTheRoots_data()
+    {
+        QTest::addColumn<QString>("name");
+        QTest::addColumn<bool>("isOurs");
+        QTest::newRow("beside the title") << "bg.png" << true;
+        QTest::newRow("nothing yet") << "later.png" << true;
+        QTest::newRow("in a folder below") << "sub/bg.png" << true;
+        QTest::newRow("of another folder") << "../other/bg.png" << true;
+        QTest::newRow("of a preset") << "%1/templates/bg.png" << true;
+        QTest::newRow("of a user template") << "%1/usertemplates/T/bg.png" << true;
+        QTest::newRow("a link to a preset") << "preset.png" << true;
+        QTest::newRow("outside") << "%1/outside.png" << false;
+        QTest::newRow("outside, climbing") << "../../outside.png" << false;
+        QTest::newRow("outside, from a root") << "%1/templates/../outside.png" << false;
+        QTest::newRow("outside, with a like name") << "%1/titles2/bg.png" << false;
+        QTest::newRow("outside, by a link") << "link.png" << false;
+        QTest::newRow("a link to nothing") << "dangling.png" << false;
+        QTest::newRow("in a folder that is a link") << "linked/outside.png" << false;
+        QTest::newRow("a root") << "%1/titles" << false;
+        QTest::newRow("the system's") << "/etc/passwd" << false;
+    }
+
+    void picturesStayBelowTheRoots()
+    {
+        QFETCH(QString, name);
+        QFETCH(bool, isOurs);
+        name.replace("%1", base("").chopped(1));
+        for (const char* folder : {"templates", "usertemplates/T", "titles/other", "titles2"})
+            QVERIFY(QDir(base("")).mkpath(folder));
+        QVERIFY(QDir(mFolder).mkpath("sub"));
+        for (const QString& picture :
+             {file("bg.png"), file("sub/bg.png"), base("titles/other/bg.png"), base("templates/bg.png"),
+              base("usertemplates/T/bg.png"), base("outside.png"), base("titles2/bg.png")})
+            write(picture, "picture");
+        QVERIFY(QFile::link(base("outside.png"), file("link.png")));
+        QVERIFY(QFile::link(base("nothing.png"), file("dangling.png")));
+        QVERIFY(QFile::link(base("templates/bg.png"), file("preset.png")));
+        QVERIFY(QFile::link(base(""), file("linked")));
+        Archive source;
+        source.setPath(file("t.xml").toStdString());
+        source.setThumbnailSmall(name.toStdString());
+        source.setThumbnailBig(name.toStdString());
+        source.setThumbnailMiddle(name.toStdString());
+        source.setThumbnailBlack(name.toStdString());
+        source.setBgResource(name.toStdString());
+        source.setBgResourceBig(name.toStdString());
+        QCOMPARE(!source.getFullPathOfThumbnailSmall().isNull(), isOurs);
+        QCOMPARE(!source.getFullPathOfBgResource().isNull(), isOurs);
+        QCOMPARE(!source.getFullPathOfBgResourceBig().isNull(), isOurs);
+        // Nor is it copied into the folder of another title.
+        Archive target;
+        target.setPath(base("titles/other/copy.xml").toStdString());
+        target.setThumbnailSmall("small.png");
+        target.setThumbnailBig("big.png");
+        target.setThumbnailMiddle("middle.png");
+        target.setThumbnailBlack("black.png");
+        target.setBgResource("one.png");
+        target.setBgResourceBig("two.png");
+        ArchiveController().copyArchiveThumbnail(&source, &target);
+        ArchiveController().copyArchiveBg(&source, &target);
+        const bool isCopied = isOurs && name != "later.png";
+        for (const char* copy : {"one.png", "two.png"})
+            QCOMPARE(QFile::exists(base("titles/other/") + copy), isCopied);
+        for (const char* copy :
+             {"small.png", "big.png", "middle.png", "black.png"}) // always beside the title
+            QCOMPARE(QFile::exists(base("titles/other/") + copy), isCopied && !name.startsWith('/'));
     }
 
     void namesOfPictures()
@@ -347,17 +433,19 @@ private Q_SLOTS:
         QVERIFY(!controller.saveNewArchive("", &archive));
         QVERIFY(!controller.saveNewArchive(QString(), &archive));
         QVERIFY(!controller.saveNewArchive("x", nullptr));
-        QTest::ignoreMessage(QtDebugMsg, "Save new Archive Success !");
+        mLog.takeDebugLines();
         QVERIFY(controller.saveNewArchive("x", &archive));
         Archive empty;
-        QTest::ignoreMessage(QtDebugMsg, "Save new Archive Path is invalid !");
         QVERIFY(!controller.saveNewArchive("x", &empty));
         CanvasController canvas;
-        QTest::ignoreMessage(QtDebugMsg, "Save Archive Success !");
         canvas.saveArchiveChange("x", &archive);
-        QTest::ignoreMessage(QtDebugMsg, "Path is invalid !");
         canvas.saveArchiveChange("x", nullptr);
         canvas.saveArchiveChange("", nullptr);
+        QCOMPARE(mLog.takeDebugLines(),
+                 QStringList({"[ArchiveController] 200: Save new Archive Success !",
+                              "[ArchiveController] 200: Save new Archive Path is invalid !",
+                              "[CanvasController] 200: Save Archive Success !",
+                              "[CanvasController] 200: Path is invalid !"}));
         Archive loaded;
         QVERIFY(controller.getOneArchive(file("a.xml"), &loaded));
         QVERIFY(!controller.getOneArchive(file("b.xml"), &loaded));
@@ -461,13 +549,13 @@ private Q_SLOTS:
         QFETCH(QStringList, rows);
         QFETCH(QString, expected);
         setOrder(rows);
-        const QByteArray before = read(mLogs.filePath("k2_ope.log"));
+        mLog.takeOperations();
         ArchiveController controller;
         QCOMPARE(controller.getFreeNameInUserTemplate(mFolder), expected);
-        const QByteArray logged = read(mLogs.filePath("k2_ope.log")).mid(before.size());
+        const QStringList logged = mLog.takeOperations("T");
         const bool isAtMax = !rows.isEmpty() && rows.last().contains("999");
-        QCOMPARE(logged.contains("[T] 300: getFreeNameInUserTemplate() Counter is Max."), isAtMax);
-        QCOMPARE(logged.contains("[T] 400: getFreeNameInUserTemplate() reach INT_MAX. Exit."),
+        QCOMPARE(logged.contains("300: getFreeNameInUserTemplate() Counter is Max."), isAtMax);
+        QCOMPARE(logged.contains("400: getFreeNameInUserTemplate() reach INT_MAX. Exit."),
                  expected.isEmpty());
     }
 
@@ -591,7 +679,7 @@ private:
             qFatal("cannot write %s", qPrintable(name));
     }
 
-    QTemporaryDir mLogs;
+    LogFixture mLog;
     std::unique_ptr<QTemporaryDir> mRoot;
     QString mFolder;
 };

@@ -7,6 +7,7 @@
 #include <QColorSpace>
 #include <QDir>
 #include <QFile>
+#include <QFileInfo>
 #include <QPainter>
 #include <QTemporaryDir>
 #include <QtTest/QTest>
@@ -275,15 +276,84 @@ private Q_SLOTS:
                  QStringList({"small.jpe", "source.png", "黑.JPE"}));
     }
 
+    void aChunkOfGigabytesIsNotMadeRoomFor_data()
+    {
+        QTest::addColumn<QByteArray>("type");
+        for (const char* type : {"tEXt", "zTXt", "iTXt", "sPLT", "eXIf"})
+            QTest::newRow(type) << QByteArray(type);
+    }
+
+    void aChunkOfGigabytesIsNotMadeRoomFor()
+    {
+        QFETCH(QByteArray, type);
+        QVERIFY(PngWriter::save(pattern(1, 1, QImage::Format_ARGB32), mFolder->filePath("one.png")));
+        QFile file(mFolder->filePath("one.png"));
+        QVERIFY(file.open(QIODevice::ReadOnly));
+        QByteArray bytes = file.readAll();
+        bytes.insert(33, QByteArray("\x70\0\0\0", 4) + type + QByteArray(200, 'x'));
+        QFile claimed(mFolder->filePath("claimed.png"));
+        QVERIFY(claimed.open(QIODevice::WriteOnly) && claimed.write(bytes) == bytes.size());
+        claimed.close();
+        const qint64 before = peakMemory();
+        QVERIFY(!ImageResizer().isAvailableImage(path("claimed.png")));
+        QVERIFY(ImageResizer().isAvailableImage(path("one.png")));
+#ifndef __SANITIZE_ADDRESS__
+        const qint64 grown = peakMemory() - before;
+        QVERIFY2(grown < 50000, qPrintable(QString("%1 kB").arg(grown)));
+#endif
+    }
+
+    void linksAreReplacedAndNotWrittenThrough()
+    {
+        const QString victim = mFolder->filePath("victim");
+        QFile file(victim);
+        QVERIFY(file.open(QIODevice::WriteOnly) && file.write("kept") == 4);
+        file.close();
+        const QImage image = pattern(960, 540, QImage::Format_RGB32);
+        for (const char* name : {"link.png", "link.jpe"})
+            QVERIFY(QFile::link(victim, mFolder->filePath(name)));
+        QVERIFY(QFile::link(mFolder->filePath("nothing"), mFolder->filePath("dangling.png")));
+        std::wstring black = path("link.png"), small = path("link.jpe");
+        QVERIFY(ImageResizer().resizeImageToThumbnail(image, black, small, 240, 135));
+        QVERIFY(PngWriter::save(image, mFolder->filePath("dangling.png")));
+        QVERIFY(file.open(QIODevice::ReadOnly));
+        QCOMPARE(file.readAll(), QByteArray("kept"));
+        QVERIFY(!QFile::exists(mFolder->filePath("nothing")));
+        for (const char* name : {"link.png", "link.jpe", "dangling.png"})
+            QVERIFY(!QFileInfo(mFolder->filePath(name)).isSymLink());
+        QCOMPARE(read("link.png").size(), QSize(240, 135));
+        QCOMPARE(read("dangling.png").size(), image.size());
+    }
+
 private:
+    // Largest size of the address space so far, in kB.
+    static qint64 peakMemory()
+    {
+        QFile file("/proc/self/status");
+        if (!file.open(QIODevice::ReadOnly))
+            return -1;
+        const QList<QByteArray> lines = file.readAll().split('\n');
+        for (const QByteArray& line : lines) {
+            if (line.startsWith("VmPeak:"))
+                return line.mid(7).trimmed().split(' ').constFirst().toLongLong();
+        }
+        return -1;
+    }
+
     QString checkerPath() const
     {
         return mFolder->filePath("defaultuser/resources/Templates/checker_240x135.png");
     }
 
-    std::wstring path(const QString& name) const { return mFolder->filePath(name).toStdWString(); }
+    std::wstring path(const QString& name) const
+    {
+        return mFolder->filePath(name).toStdWString();
+    }
 
-    QImage read(const QString& name) const { return QImage(mFolder->filePath(name)); }
+    QImage read(const QString& name) const
+    {
+        return QImage(mFolder->filePath(name));
+    }
 
     bool resize(const QImage& image)
     {

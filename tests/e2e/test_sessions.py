@@ -21,6 +21,9 @@ class ClosingQuestion(harness.TitlerTest):
         self.click_tool("Close")
         message = self.wait_call("MessageCenter", "postMessage", start)
         self.assertEqual(message["messageId"], CONFIRM_CLOSE)
+        before = self.display.grab()
+        self.command("message-mask 1")  # as the message center does around a box
+        harness.session.wait_until(lambda: self.display.grab() != before, 20 * harness.SLOW, "the mask")
         self.assertTrue(self.stays_shown())
         # The answer to another question is not the answer to this one.
         self.command(f"message-close 110 {ANSWER_OK}")
@@ -29,6 +32,12 @@ class ClosingQuestion(harness.TitlerTest):
         self.wait_closed(start)
         self.assertEqual(len(self.titles(folder)), 5)
         self.assertEqual(self.results(start), [])
+
+        # The mask over the window went with it, and is not taken away before it is hidden.
+        self.command("message-mask 0")
+        self.open_title(self.titles(folder)[0])
+        self.assert_canvas_shows(self.titles(folder)[0], mean=1.0, visible=0.01)
+        self.close_window()
 
         # The question was for that session only.
         self.open_title(self.titles(folder)[0])

@@ -25,6 +25,47 @@ private Q_SLOTS:
     }
     void cleanup() { f.close(); }
 
+    // --- Links ----------------------------------------------------------------------------------------
+
+    void linksElsewhereAreNoFolders()
+    {
+        const QString outside = QFileInfo(f.root()).path() + QStringLiteral("/outside");
+        QDir(outside).removeRecursively();
+        QVERIFY(QDir().mkpath(outside));
+        LibraryFixture::fillFolder(outside, {"foreign"});
+        QVERIFY(QFile::link(outside, f.path("link")));
+        QVERIFY(QFile::link(f.path("a"), f.path("inside")));
+        QVERIFY(QFile::link(outside + QStringLiteral("/foreign.xml"), f.path("a/foreign.xml")));
+        LibraryFixture::writeOrder(f.path("a"), {"t1", "foreign", "t2"});
+        f.picker->updateTreeView();
+        QCOMPARE(f.names(), QStringList({"a", "b", "c", "inside"}));
+        QCOMPARE(f.names(f.row("a")), QStringList({"t1", "t2"}));
+        // One that becomes a link while it is listed goes when it is used.
+        QVERIFY(QDir(f.path("c")).removeRecursively() && QFile::link(outside, f.path("c")));
+        QSignalSpy folder(f.picker.get(), &FolderPicker::changeFolderPath);
+        f.tap("c");
+        f.tapButton("openFolderButton");
+        QVERIFY(folder.isEmpty());
+        QCOMPARE(f.names(), QStringList({"a", "b", "inside"}));
+        // Nor does a notice lead there.
+        QSignalSpy renamed(f.picker.get(), &FolderPicker::folderNameChange);
+        f.picker->setCurrentFolderName(QStringLiteral("a"));
+        renameOutside("b", "d");
+        QVERIFY(f.picker->treeModel()->rowCount() == 3 && renamed.isEmpty());
+        notify("a", "link");
+        QVERIFY(renamed.isEmpty());
+        QCOMPARE(f.names(), QStringList({"a", "d", "inside"}));
+        // What links bring in is not copied.
+        f.tap("a");
+        f.tapButton("duplicateFolderButton");
+        f.enter("copy");
+        QVERIFY(QFile::exists(f.path("copy/t1.xml")));
+        QVERIFY(!QFile::exists(f.path("copy/foreign.xml")));
+        QFile::remove(f.path("link"));
+        QFile::remove(f.path("c"));
+        QVERIFY(QFile::exists(outside + QStringLiteral("/foreign.xml")));
+    }
+
     // --- Renames --------------------------------------------------------------------------------------
 
     void renameOfAFolder_data()

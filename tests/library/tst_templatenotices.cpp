@@ -50,6 +50,9 @@ private Q_SLOTS:
     void importPaths();
     void importOfAFolderThatIsNotThere_data();
     void importOfAFolderThatIsNotThere();
+    void pathsOutsideChangeNothing_data();
+    void pathsOutsideChangeNothing();
+    void foldersThatAreLinksElsewhere();
     void taps();
 
 private:
@@ -234,6 +237,75 @@ void tst_TemplateNotices::importOfAFolderThatIsNotThere()
     // And a reading of what is on disk tells no other.
     mPicker->reloadTemplates2();
     QCOMPARE(names(), QStringList({"UserTemplate_001", "UserTemplate_003"}));
+}
+
+void tst_TemplateNotices::pathsOutsideChangeNothing_data()
+{
+    QTest::addColumn<QString>("folder");
+    QTest::newRow("elsewhere") << "%2/elsewhere/UserTemplate_002";
+    QTest::newRow("climbing") << "%1/../../elsewhere/UserTemplate_002";
+    QTest::newRow("by a link") << "%1/link/UserTemplate_002";
+    QTest::newRow("beside the root") << "%1 2/UserTemplate_002";
+    QTest::newRow("of the titles") << "%2/defaultuser/titles/UserTemplate_002";
+}
+
+void tst_TemplateNotices::pathsOutsideChangeNothing()
+{
+    QFETCH(QString, folder);
+    const QString data = QFileInfo(QFileInfo(mFixture.userRoot()).path()).path();
+    folder.replace("%2", data);
+    folder = told(folder);
+    QVERIFY(QDir().mkpath(data + "/elsewhere"));
+    QFile::remove(mFixture.userRoot() + "/link");
+    QVERIFY(QFile::link(data + "/elsewhere", mFixture.userRoot() + "/link"));
+    QVERIFY(QDir().mkpath(folder));
+    for (const char* file : {"/Titler.xml", "/Titler_240.png"})
+        QVERIFY(QFile::exists(folder + file) ||
+                QFile::copy(mFixture.userRoot() + "/UserTemplate_003" + file, folder + file));
+    const QStringList before = names();
+    const QString path = users()->archive(1)->getPath().c_str();
+    const auto isUnchanged = [&] {
+        return names() == before && mFixture.userOrder() == before &&
+               users()->archive(1)->getPath().c_str() == path && QFile::exists(path) &&
+               QFile::exists(folder + "/Titler.xml") && QFile::exists(folder + "/Titler_240.png");
+    };
+    mLog.takeDebugLines();
+    for (const QString& notice : {folder, folder + "/", folder + "/Titler.xml"}) {
+        mPicker->slotDeleteUserTemplate(notice);
+        QVERIFY2(isUnchanged(), qPrintable("delete " + notice));
+        QCOMPARE(systemLog.size() + mLog.takeDebugLines().size(), 1);
+        systemLog.clear();
+        mPicker->slotImportNewUserTemplate(notice);
+        QVERIFY2(isUnchanged(), qPrintable("import " + notice));
+        QCOMPARE(mLog.takeDebugLines("ConfinedPath").size(), 1);
+        mPicker->slotRenameUserTemplate("UserTemplate_002", "after", notice);
+        QVERIFY2(isUnchanged(), qPrintable("rename " + notice));
+        QCOMPARE(mLog.takeDebugLines("ConfinedPath").size(), 1);
+    }
+    QVERIFY(systemLog.isEmpty());
+    // A record that leads outside all the same deletes nothing there.
+    UserTemplatePickerController().deleteTemplate((folder + "/Titler.xml").toStdString());
+    QVERIFY(isUnchanged());
+}
+
+void tst_TemplateNotices::foldersThatAreLinksElsewhere()
+{
+    const QString elsewhere = QFileInfo(QFileInfo(mFixture.userRoot()).path()).path() + "/elsewhere template";
+    QVERIFY(QDir(mFixture.userRoot()).rename("UserTemplate_003", elsewhere));
+    QVERIFY(QFile::link(elsewhere, mFixture.userRoot() + "/UserTemplate_003"));
+    const QStringList before = names();
+    QVERIFY(QFile::remove(elsewhere + "/Titler.xml"));
+    mPicker->slotImportNewUserTemplate("UserTemplate_003");
+    QCOMPARE(names(), before);
+    QVERIFY(!QFile::exists(elsewhere + "/Titler.xml"));
+    // The next reading leaves it out.
+    QVERIFY(QFile::copy(mFixture.userTitle("UserTemplate_001"), elsewhere + "/Titler.xml"));
+    UserTemplateManager::getInstance()->reCreateNewOrderXml();
+    QCOMPARE(mFixture.userOrder(), QStringList({"UserTemplate_001", "UserTemplate_002"}));
+    Archive archive;
+    QCOMPARE(UserTemplateManager::getInstance()->createNewTemplateXml("UserTemplate_003", &archive), 0);
+    QCOMPARE(UserTemplateManager::getInstance()->loadTemplate("UserTemplate_003", &archive), 0);
+    QDir(elsewhere).removeRecursively();
 }
 
 void tst_TemplateNotices::taps()

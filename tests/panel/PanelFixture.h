@@ -68,6 +68,9 @@ public:
     // "[area] number: text" of every line of the operation log since the last call.
     QStringList newLogLines() { return log.takeOperations(); }
 
+    // The same of the debug log.
+    QStringList newDebugLines() { return log.takeDebugLines(); }
+
     // The screen of the tests is smaller than the appliance's, so the window comes to the finger.
     void bringOnScreen(QWidget* widget, QPoint point)
     {

@@ -30,6 +30,7 @@ private Q_SLOTS:
     void refreshKeepsTheFamily();
     void importedFileJoinsTheList();
     void brokenFilesArePassedOver();
+    void fontsOutsideAreNotImported();
     void removedFontLeavesTheList();
     void paintsTheDisplayName();
 
@@ -205,6 +206,24 @@ void TestFontBox::brokenFilesArePassedOver()
     FamilyToolBox later(nullptr);
     QVERIFY(later.comboBox()->findText(QStringLiteral("KST")) >= 0);
     QVERIFY(QFile::remove(pipe) && broken.remove() && empty.remove());
+}
+
+void TestFontBox::fontsOutsideAreNotImported()
+{
+    combo()->addImportFontsToApplication(true, true, QString());
+    const QString inside = m_fonts + QStringLiteral("/imported.ttf");
+    const QString outside = QFileInfo(m_fonts).path() + QStringLiteral("/outside.ttf");
+    const QString link = m_fonts + QStringLiteral("/link.ttf");
+    QVERIFY(QFile::rename(inside, outside));
+    combo()->addImportFontsToApplication(true, true, QString());
+    QVERIFY(QFile::link(outside, link));
+    for (const char* file : {"../outside.ttf", "link.ttf"})
+        m_box->importFontFamilyNotify(QString::fromLatin1(file));
+    QVERIFY(!rows().contains(QStringLiteral(TITLER_IMPORTED_FAMILY)));
+    combo()->addImportFontsToApplication(true, true, QString()); // as at a start
+    combo()->refreshFontListView(true);
+    QVERIFY(!rows().contains(QStringLiteral(TITLER_IMPORTED_FAMILY)));
+    QVERIFY(QFile::remove(link) && QFile::rename(outside, inside));
 }
 
 void TestFontBox::removedFontLeavesTheList()

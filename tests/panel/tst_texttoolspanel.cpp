@@ -674,8 +674,10 @@ void TestTextToolsPanel::movesAndPreviewsAreNotRemembered()
     m_panel->panel->changeTextColor(QStringLiteral("#00C743"), 4, 0);
     FontStyle style;
     QCOMPARE(SettingManager().loadLastTextParameter(&style), 0);
-    QTest::ignoreMessage(QtDebugMsg, "read xml file failed");
+    m_environment->newDebugLines();
     QCOMPARE(TextToolsPanelController().getLastTextStyle().getSize(), 96);
+    QCOMPARE(m_environment->newDebugLines(),
+             QStringList("[TextToolsPanelController] 200: read xml file failed"));
 }
 
 void TestTextToolsPanel::brokenSettings()

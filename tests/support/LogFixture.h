@@ -15,6 +15,7 @@ public:
     LogFixture()
     {
         qputenv("K2SYS_LOG_DIR", mDir.path().toLocal8Bit());
+        UNINIT_LOGGING(); // the input context of an application has begun in another folder
         INIT_LOGGING(L"test");
     }
     ~LogFixture() { UNINIT_LOGGING(); }

@@ -1,5 +1,6 @@
 // A program for the signal tests to signal: it registers the handler, says "ready" and tells what happens to
 // it.
+#include "support/AlternateStack.h"
 #include "support/SystemSignalHandler.h"
 
 #include <QCoreApplication>
@@ -11,7 +12,9 @@
 
 #include <csignal>
 #include <cstdio>
+#include <cstdlib>
 #include <cstring>
+#include <memory>
 
 namespace
 {
@@ -94,6 +97,47 @@ int faultAfterFault()
     return 0;
 }
 
+// Goes down until the stack ends.
+int fillStack(int depth)
+{
+    volatile char block[4096];
+    block[0] = static_cast<char>(depth);
+    const int result = depth < 0 ? 0 : fillStack(depth + 1);
+    return result + block[0];
+}
+
+void giveUp()
+{
+    std::abort();
+}
+
+void fillOwnStack()
+{
+    AlternateStack::useInThisThread(); // in the main thread the registration does
+    say(fillStack(1) != 0 ? "the stack has no end" : "");
+}
+
+void fault()
+{
+    raise(SIGSEGV);
+}
+
+int endBy(void (*end)())
+{
+    registerSystemSignalHandler(nullptr, "probe");
+    end();
+    return 0;
+}
+
+int endInThreadBy(void (*end)())
+{
+    registerSystemSignalHandler(nullptr, "probe");
+    std::unique_ptr<QThread> thread(QThread::create([end] { end(); }));
+    thread->start();
+    thread->wait();
+    return 0;
+}
+
 } // namespace
 
 int main(int argc, char** argv)
@@ -114,6 +158,21 @@ int main(int argc, char** argv)
     }
     if (std::strcmp(mode, "again") == 0) {
         return faultAfterFault();
+    }
+    if (std::strcmp(mode, "abort") == 0) {
+        return endBy(giveUp);
+    }
+    if (std::strcmp(mode, "abort-thread") == 0) {
+        return endInThreadBy(giveUp);
+    }
+    if (std::strcmp(mode, "fault") == 0) {
+        return endBy(fault);
+    }
+    if (std::strcmp(mode, "overflow") == 0) {
+        return endBy(fillOwnStack);
+    }
+    if (std::strcmp(mode, "overflow-thread") == 0) {
+        return endInThreadBy(fillOwnStack);
     }
     return 2;
 }

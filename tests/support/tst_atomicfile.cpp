@@ -89,6 +89,23 @@ private Q_SLOTS:
         QVERIFY(S_ISLNK(status.st_mode));
     }
 
+    void nobodyElseMayWrite()
+    {
+        const mode_t before = ::umask(0);
+        const std::string file = path("new.xml");
+        QVERIFY(AtomicFile::write(file, "bytes"));
+        put(path("open.xml"), "old");
+        QVERIFY(::chmod(path("open.xml").c_str(), 0666) == 0);
+        QVERIFY(AtomicFile::write(path("open.xml"), "new"));
+        QVERIFY(AtomicFile::copy(file, path("copy.xml")));
+        ::umask(before);
+        for (const char* name : {"new.xml", "open.xml", "copy.xml"}) {
+            struct stat status = {};
+            QVERIFY(::stat(path(name).c_str(), &status) == 0);
+            QCOMPARE(int(status.st_mode & 07777), 0644);
+        }
+    }
+
     void aNameThatFillsTheLimitIsSaved()
     {
         const std::string file = path(QString(240, QLatin1Char('n')) + ".xml");

@@ -2,11 +2,18 @@
 #include "support/LocaleText.h"
 #include "support/LogManager.h"
 
+#include <QCoreApplication>
+#include <QDir>
 #include <QFile>
+#include <QFileInfo>
+#include <QHash>
+#include <QProcess>
 #include <QRegularExpression>
+#include <QSet>
 #include <QTemporaryDir>
 #include <QTest>
 
+#include <sys/stat.h>
 #include <unistd.h>
 
 #include <cstdarg>
@@ -65,8 +72,22 @@ private Q_SLOTS:
     void putLogCutsLongFormats();
     void putLogWithoutFile();
     void systemLogTakesAnything();
+    void controlCharactersAreEscaped_data();
+    void controlCharactersAreEscaped();
+    void longTextsAreCut();
+    void onlyTheOwnerWrites();
+    void linksAreNotFollowed();
+    void pipesAreNotWaitedFor();
+    void logsRotate();
+    void aRotationThatFailsStartsAnew();
+    void aRemovedLogIsMadeAgain();
+    void twoProcessesShareTheLogs();
 
 private:
+    // Starts this program again as one that writes so many numbered lines.
+    void startWriter(QProcess& process, const char* name, int lines) const;
+    static int mode(const QString& path);
+
     QString operationLog() const { return m_folder->filePath("k2_ope.log"); }
     QString debugLog() const { return m_folder->filePath("k2_ope_debug.log"); }
 
@@ -246,5 +267,214 @@ void TestLogging::systemLogTakesAnything()
     QCOMPARE(linesOf(operationLog()).size(), 0);
 }
 
-QTEST_GUILESS_MAIN(TestLogging)
+void TestLogging::controlCharactersAreEscaped_data()
+{
+    QTest::addColumn<QString>("text");
+    QTest::addColumn<QString>("logged");
+    QTest::newRow("line feed") << "a\nb"
+                               << "a\\nb";
+    QTest::newRow("carriage return") << "a\rb"
+                                     << "a\\rb";
+    QTest::newRow("tab") << "a\tb"
+                         << "a\\tb";
+    QTest::newRow("escape") << "\x1b[2J"
+                            << "\\x1b[2J";
+    QTest::newRow("delete") << "a\x7f"
+                            << "a\\x7f";
+    QTest::newRow("next line, of the second set") << QStringLiteral("a\u0085b") << "a\\x85b";
+    QTest::newRow("control sequence introducer") << QStringLiteral("\u009b2J") << "\\x9b2J";
+    QTest::newRow("line separator") << QStringLiteral("a\u2028b") << "a\\u2028b";
+    QTest::newRow("writing direction") << QStringLiteral("a\u202eb") << "a\\u202eb";
+    QTest::newRow("a backslash stays") << "a\\b"
+                                       << "a\\b";
+    QTest::newRow("ordinary texts stay")
+        << QString::fromUtf8("速報 é \U0001F600") << QString::fromUtf8("速報 é \U0001F600");
+}
+
+void TestLogging::controlCharactersAreEscaped()
+{
+    QFETCH(QString, text);
+    QFETCH(QString, logged);
+    INIT_LOGGING(L"KS2\nTitler");
+    LOG_USER_OPERATE(L"Text\nInput", 200, text.toStdWString());
+    QCOMPARE(linesOf(operationLog()).size(), 1);
+    QVERIFY2(linesOf(operationLog()).front().endsWith("]: [Text\\nInput] 200: " + logged),
+             qPrintable(linesOf(operationLog()).front()));
+    QVERIFY(linesOf(operationLog()).front().contains(" localhost KS2\\nTitler["));
+    const QString own = m_folder->filePath("own");
+    FILE* file = std::fopen(own.toLocal8Bit().constData(), "a+");
+    put(file, "mod\nule", 7, "%s", text.toUtf8().constData());
+    std::fclose(file);
+    QCOMPARE(linesOf(own).size(), 1);
+    QVERIFY2(linesOf(own).front().endsWith("[mod\\nule] 007: " + logged), qPrintable(linesOf(own).front()));
+}
+
+void TestLogging::longTextsAreCut()
+{
+    INIT_LOGGING(L"KS2Titler");
+    LOG_USER_OPERATE(L"Text Input", 200, std::wstring(3000000, L'速'));
+    LOG_USER_OPERATE(L"Text Input", 201, L"next");
+    const QStringList lines = linesOf(operationLog());
+    QCOMPARE(lines.size(), 2);
+    QVERIFY(lines.front().contains(QString::fromUtf8("200: 速速速")));
+    QVERIFY(lines.front().toUtf8().size() < 10000);
+    QVERIFY(!lines.front().contains(QChar(QChar::ReplacementCharacter)));
+}
+
+int TestLogging::mode(const QString& path)
+{
+    struct stat status = {};
+    return ::stat(path.toLocal8Bit().constData(), &status) == 0 ? int(status.st_mode & 07777) : -1;
+}
+
+void TestLogging::onlyTheOwnerWrites()
+{
+    for (const mode_t mask : {mode_t(0), mode_t(022), mode_t(077)}) {
+        init();
+        const mode_t before = ::umask(mask);
+        INIT_LOGGING(L"KS2Titler");
+        LOG_USER_OPERATE(L"A", 1, L"x");
+        ::umask(before);
+        QCOMPARE(mode(operationLog()), 0640);
+        QCOMPARE(mode(debugLog()), 0640);
+        cleanup();
+    }
+    // Also a log that an older program left.
+    init();
+    QFile old(operationLog());
+    QVERIFY(old.open(QIODevice::WriteOnly));
+    QVERIFY(::chmod(operationLog().toLocal8Bit().constData(), 0666) == 0);
+    INIT_LOGGING(L"KS2Titler");
+    QCOMPARE(mode(operationLog()), 0640);
+}
+
+void TestLogging::linksAreNotFollowed()
+{
+    const QString victim = m_folder->filePath("victim");
+    QFile file(victim);
+    QVERIFY(file.open(QIODevice::WriteOnly));
+    file.write("kept");
+    file.close();
+    QVERIFY(QFile::link(victim, operationLog()));
+    QVERIFY(QFile::link(m_folder->filePath("nothing"), debugLog()));
+    INIT_LOGGING(L"KS2Titler");
+    LOG_USER_OPERATE(L"A", 1, L"x");
+    LOG_DEBUG_OPERATE(L"A", 1, L"x");
+    QVERIFY(file.open(QIODevice::ReadOnly));
+    QCOMPARE(file.readAll(), QByteArray("kept"));
+    QVERIFY(!QFile::exists(m_folder->filePath("nothing")));
+}
+
+void TestLogging::pipesAreNotWaitedFor()
+{
+    QVERIFY(::mkfifo(operationLog().toLocal8Bit().constData(), 0600) == 0);
+    INIT_LOGGING(L"KS2Titler");
+    LOG_USER_OPERATE(L"A", 1, L"x");
+    LOG_DEBUG_OPERATE(L"A", 1, L"x");
+    QCOMPARE(linesOf(debugLog()).size(), 1);
+}
+
+void TestLogging::logsRotate()
+{
+    INIT_LOGGING(L"KS2Titler");
+    const std::wstring filler(1000, L'x');
+    const int lines = 7000;
+    for (int i = 0; i < lines; ++i)
+        LOG_USER_OPERATE(L"A", i, filler);
+    const QStringList names = QDir(m_folder->path()).entryList({"k2_ope.log*"}, QDir::Files, QDir::Name);
+    QCOMPARE(names,
+             QStringList({"k2_ope.log", "k2_ope.log.1", "k2_ope.log.2", "k2_ope.log.3", "k2_ope.log.4"}));
+    int next = -1;
+    for (int i = 4; i >= 0; --i) { // the oldest first
+        const QString path = operationLog() + (i == 0 ? QString() : QString(".%1").arg(i));
+        QVERIFY(QFileInfo(path).size() <= 1000000);
+        QCOMPARE(mode(path), 0640);
+        for (const QString& line : linesOf(path)) {
+            const int number = line.section("[A] ", 1).section(':', 0, 0).toInt();
+            QVERIFY2(next == -1 || number == next, qPrintable(line.left(100)));
+            next = number + 1;
+        }
+    }
+    QCOMPARE(next, lines);
+    QCOMPARE(QDir(m_folder->path()).entryList({"k2_ope_debug.log*"}, QDir::Files),
+             QStringList("k2_ope_debug.log"));
+}
+
+void TestLogging::aRotationThatFailsStartsAnew()
+{
+    QVERIFY(QDir(m_folder->path()).mkpath("k2_ope.log.1/in the way"));
+    INIT_LOGGING(L"KS2Titler");
+    for (int i = 0; i < 3000; ++i)
+        LOG_USER_OPERATE(L"A", i, std::wstring(1000, L'x'));
+    QVERIFY(QFileInfo(operationLog()).size() <= 1000000);
+    QVERIFY(linesOf(operationLog()).back().contains("[A] 2999: xxx"));
+}
+
+void TestLogging::aRemovedLogIsMadeAgain()
+{
+    INIT_LOGGING(L"KS2Titler");
+    LOG_USER_OPERATE(L"A", 1, L"x");
+    QVERIFY(QFile::remove(operationLog()));
+    LOG_USER_OPERATE(L"A", 2, L"x");
+    QCOMPARE(linesOf(operationLog()).size(), 1);
+}
+
+void TestLogging::startWriter(QProcess& process, const char* name, int lines) const
+{
+    process.setProcessChannelMode(QProcess::ForwardedErrorChannel);
+    process.start(QCoreApplication::applicationFilePath(),
+                  {QStringLiteral("--write"), QString::fromLatin1(name), QString::number(lines)});
+}
+
+void TestLogging::twoProcessesShareTheLogs()
+{
+    const int lines = 1800; // of both together nearly four files
+    QProcess one;
+    QProcess other;
+    startWriter(one, "one", lines);
+    startWriter(other, "other", lines);
+    for (QProcess* process : {&one, &other}) {
+        QVERIFY(process->waitForFinished(60000));
+        QCOMPARE(process->exitCode(), 0);
+    }
+    // No line is lost or mixed with another, and each process's lines stand in their order within a file.
+    QHash<QString, QSet<int>> found;
+    for (int i = 4; i >= 0; --i) {
+        const QString path = operationLog() + (i == 0 ? QString() : QString(".%1").arg(i));
+        QVERIFY(QFileInfo(path).size() <= 1000000 + 2 * 1100);
+        for (const QString& line : linesOf(path)) {
+            static const QRegularExpression format(R"( localhost (one|other)\[\d+\]: \[A\] (\d+): x{1000}$)");
+            const QRegularExpressionMatch match = format.match(line);
+            QVERIFY2(match.hasMatch(), qPrintable(line.left(200)));
+            QVERIFY(!found[match.captured(1)].contains(match.captured(2).toInt()));
+            found[match.captured(1)].insert(match.captured(2).toInt());
+        }
+    }
+    QCOMPARE(found.value("one").size(), lines);
+    QCOMPARE(found.value("other").size(), lines);
+}
+
+namespace
+{
+
+int writeLines(const char* name, int lines)
+{
+    INIT_LOGGING(multiByteToWide(name));
+    for (int i = 0; i < lines; ++i)
+        LOG_USER_OPERATE(L"A", i, std::wstring(1000, L'x'));
+    UNINIT_LOGGING();
+    return 0;
+}
+
+} // namespace
+
+int main(int argc, char** argv)
+{
+    if (argc == 4 && std::string(argv[1]) == "--write")
+        return writeLines(argv[2], std::atoi(argv[3]));
+    QCoreApplication application(argc, argv);
+    TestLogging test;
+    return QTest::qExec(&test, argc, argv);
+}
+
 #include "tst_logging.moc"

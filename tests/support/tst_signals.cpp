@@ -16,6 +16,10 @@ private Q_SLOTS:
     void faultsLeaveATrace();
     void faultAfterTheTableWasFreed();
     void harmlessSignalsChangeNothing();
+    void anAbortLeavesOneTrace_data();
+    void anAbortLeavesOneTrace();
+    void aFullStackLeavesATrace_data();
+    void aFullStackLeavesATrace();
 
 private:
     static QByteArray readUntil(QProcess& process, const QByteArray& text);
@@ -111,6 +115,49 @@ void TestSignals::harmlessSignalsChangeNothing()
     QVERIFY(probe.waitForFinished());
     QCOMPARE(probe.readAllStandardOutput(), QByteArray("alive\n"));
     QCOMPARE(probe.exitStatus(), QProcess::NormalExit);
+}
+
+void TestSignals::anAbortLeavesOneTrace_data()
+{
+    QTest::addColumn<QString>("mode");
+    QTest::newRow("the program gives up") << "abort";
+    QTest::newRow("in another thread") << "abort-thread";
+    QTest::newRow("sent by another process") << "plain";
+    QTest::newRow("a fault") << "fault";
+}
+
+void TestSignals::anAbortLeavesOneTrace()
+{
+    QFETCH(QString, mode);
+    QProcess probe;
+    start(probe, mode);
+    if (mode == "plain") {
+        QCOMPARE(readUntil(probe, "ready"), QByteArray("ready\n"));
+        kill(static_cast<pid_t>(probe.processId()), SIGABRT);
+    }
+    QVERIFY(probe.waitForFinished());
+    QCOMPARE(probe.exitStatus(), QProcess::CrashExit);
+    QCOMPARE(probe.exitCode(), SIGABRT);
+    const QByteArray trace = probe.readAllStandardError();
+    QCOMPARE(trace.count("k2sys_print_backtrace"), 1);
+}
+
+void TestSignals::aFullStackLeavesATrace_data()
+{
+    QTest::addColumn<QString>("mode");
+    QTest::newRow("main thread") << "overflow";
+    QTest::newRow("another thread") << "overflow-thread";
+}
+
+void TestSignals::aFullStackLeavesATrace()
+{
+    QFETCH(QString, mode);
+    QProcess probe;
+    start(probe, mode);
+    QVERIFY(probe.waitForFinished());
+    QCOMPARE(probe.exitStatus(), QProcess::CrashExit);
+    QCOMPARE(probe.exitCode(), SIGABRT);
+    QVERIFY(probe.readAllStandardError().contains("libk2sys.so.1"));
 }
 
 QTEST_GUILESS_MAIN(TestSignals)

@@ -1,0 +1,59 @@
+#include "document/PictureReader.h"
+
+#include "document/PictureGuard.h"
+#include "support/AtomicFile.h"
+
+#include <QBuffer>
+#include <QFile>
+#include <QImageReader>
+
+namespace
+{
+
+// Qt's own limit is lower, and holds for every format.
+void setAllocationLimit()
+{
+    static const bool isSet = [] {
+        QImageReader::setAllocationLimit(static_cast<int>(PictureGuard::MAX_DECODED_BYTES / (1024 * 1024)));
+        return true;
+    }();
+    Q_UNUSED(isSet);
+}
+
+} // namespace
+
+PictureReader::PictureReader(const QString& path)
+{
+    if (path.isEmpty() || !AtomicFile::read(QFile::encodeName(path).toStdString(), MAX_FILE_BYTES, mBytes))
+        return;
+    const PictureGuard guard(bytes());
+    mFormat = guard.format();
+    mSize = guard.size();
+    if (!guard.isAccepted())
+        mBytes = std::string();
+}
+
+QByteArray PictureReader::bytes() const
+{
+    return QByteArray::fromRawData(mBytes.data(), static_cast<qsizetype>(mBytes.size()));
+}
+
+QImage PictureReader::read(const QSize& scaledSize) const
+{
+    if (mFormat.isEmpty())
+        return {};
+    setAllocationLimit();
+    QByteArray shared = bytes();
+    QBuffer buffer(&shared);
+    buffer.open(QIODevice::ReadOnly);
+    QImageReader reader(&buffer, mFormat);
+    reader.setAutoDetectImageFormat(false);
+    if (scaledSize.isValid())
+        reader.setScaledSize(scaledSize);
+    return reader.read();
+}
+
+QImage PictureReader::read(const QString& path)
+{
+    return PictureReader(path).read();
+}

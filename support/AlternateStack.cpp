@@ -1,0 +1,49 @@
+#include "support/AlternateStack.h"
+
+#include <cstddef>
+#include <sys/mman.h>
+
+namespace
+{
+
+// Many times what the unwinder and the registers of any processor take.
+constexpr std::size_t STACK_BYTES = 256 * 1024;
+
+// Below it, so that a handler that needs more ends the process instead of spoiling what lies there.
+constexpr std::size_t GUARD_BYTES = 64 * 1024;
+
+} // namespace
+
+void AlternateStack::useInThisThread()
+{
+    thread_local AlternateStack stack;
+}
+
+AlternateStack::AlternateStack()
+{
+    stack_t current = {};
+    if (::sigaltstack(nullptr, &current) != 0 || (current.ss_flags & SS_DISABLE) == 0)
+        return;
+    void* const pages = ::mmap(nullptr, GUARD_BYTES + STACK_BYTES, PROT_READ | PROT_WRITE,
+                               MAP_PRIVATE | MAP_ANONYMOUS | MAP_STACK, -1, 0);
+    if (pages == MAP_FAILED)
+        return;
+    mPages = pages;
+    stack_t stack = {};
+    stack.ss_sp = static_cast<char*>(pages) + GUARD_BYTES;
+    stack.ss_size = STACK_BYTES;
+    if (::mprotect(pages, GUARD_BYTES, PROT_NONE) != 0 || ::sigaltstack(&stack, nullptr) != 0) {
+        ::munmap(mPages, GUARD_BYTES + STACK_BYTES);
+        mPages = nullptr;
+    }
+}
+
+AlternateStack::~AlternateStack()
+{
+    if (!mPages)
+        return;
+    stack_t none = {};
+    none.ss_flags = SS_DISABLE;
+    if (::sigaltstack(&none, nullptr) == 0)
+        ::munmap(mPages, GUARD_BYTES + STACK_BYTES);
+}

@@ -1,0 +1,158 @@
+#include "support/ConfinedPath.h"
+
+#include "support/IPathManagerEx.h"
+#include "support/LocaleText.h"
+#include "support/LogManager.h"
+
+#include <array>
+#include <cerrno>
+#include <climits>
+#include <cstdlib>
+#include <mutex>
+#include <set>
+#include <string_view>
+#include <sys/stat.h>
+#include <unistd.h>
+
+namespace
+{
+
+constexpr int REFUSAL_NUMBER = 400;
+constexpr std::size_t REMEMBERED_REFUSALS = 256;
+
+constexpr std::array<FolderLookup::Getter, 3> TITLE_ROOTS{&IPathManagerEx::getTitleResourcesPath,
+                                                          &IPathManagerEx::getTemplatesPath,
+                                                          &IPathManagerEx::getTitlerTemplatesPath};
+
+std::string currentFolder()
+{
+    char buffer[PATH_MAX];
+    return ::getcwd(buffer, sizeof buffer) ? buffer : "";
+}
+
+// The path without links and without "." and ".."; empty when that cannot be said. The end of the path need
+// not exist.
+std::string resolved(std::string path)
+{
+    if (path.empty() || path.find('\0') != std::string::npos)
+        return {};
+    if (path.front() != '/') // as the appliance's own paths are where its root is the file system's
+        path.insert(0, currentFolder() + '/');
+    std::string missing;
+    for (;;) {
+        char buffer[PATH_MAX];
+        if (::realpath(path.c_str(), buffer)) {
+            std::string whole = buffer;
+            if (whole == "/" && !missing.empty())
+                whole.clear();
+            return whole + missing;
+        }
+        struct stat status = {};
+        if (errno != ENOENT || ::lstat(path.c_str(), &status) == 0) // a link to nothing may become one
+            return {};
+        const std::size_t slash = path.rfind('/');
+        const std::string name = path.substr(slash + 1);
+        if (name == "..")
+            return {};
+        if (!name.empty() && name != ".")
+            missing.insert(0, '/' + name);
+        path.resize(slash == 0 ? 1 : slash);
+    }
+}
+
+bool isPrefix(const std::string& folder, const std::string& path)
+{
+    const std::size_t length = folder == "/" ? 0 : folder.size();
+    return !folder.empty() && path.size() > length + 1 && path[length] == '/' &&
+           path.compare(0, length, folder, 0, length) == 0;
+}
+
+bool isBelowTitleRoots(const std::string& path)
+{
+    for (const FolderLookup::Getter root : TITLE_ROOTS) {
+        if (ConfinedPath::isBelow(root, path))
+            return true;
+    }
+    return false;
+}
+
+bool isLink(const std::string& path)
+{
+    struct stat status = {};
+    return ::lstat(path.c_str(), &status) == 0 && S_ISLNK(status.st_mode);
+}
+
+// A name that stays in its folder as long as it is not that of a link, which is cheap to see.
+bool isEntryName(std::string_view name)
+{
+    return name.find('/') == std::string_view::npos && name.find('\0') == std::string_view::npos &&
+           name != "." && name != "..";
+}
+
+bool climbs(std::string_view name)
+{
+    while (!name.empty()) {
+        const std::size_t slash = name.find('/');
+        if (name.substr(0, slash) == "..")
+            return true;
+        name.remove_prefix(slash == std::string_view::npos ? name.size() : slash + 1);
+    }
+    return false;
+}
+
+// A title is looked at again and again; its log line stands once.
+bool isNewRefusal(const std::string& path)
+{
+    static std::mutex mutex;
+    static std::set<std::string> refusals;
+    const std::lock_guard lock(mutex);
+    if (refusals.size() >= REMEMBERED_REFUSALS)
+        refusals.clear();
+    return refusals.insert(path).second;
+}
+
+std::string refuse(const std::wstring& what, const std::string& path)
+{
+    if (isNewRefusal(path))
+        ConfinedPath::logRefusal(what, path);
+    return {};
+}
+
+} // namespace
+
+bool ConfinedPath::isBelow(const std::string& folder, const std::string& path)
+{
+    return isPrefix(resolved(folder), resolved(path));
+}
+
+bool ConfinedPath::isBelow(FolderLookup::Getter root, const std::string& path)
+{
+    const std::string folder = FolderLookup::multiByte(root);
+    return !folder.empty() && isBelow(folder, path);
+}
+
+std::string ConfinedPath::namedByTitle(const std::string& folder, const std::string& path)
+{
+    const bool isBeside = path.starts_with(folder) && path.size() > folder.size() &&
+                          path[folder.size()] == '/' && isEntryName(path.substr(folder.size() + 1));
+    if ((isBeside && !isLink(path)) || isBelow(folder, path) || isBelowTitleRoots(path))
+        return path;
+    return refuse(L"a title names what lies outside: ", path);
+}
+
+std::string ConfinedPath::namedByOrder(const std::string& folder, const std::string& name)
+{
+    if (name.empty())
+        return {};
+    const std::string path = folder + '/' + name;
+    if (isEntryName(name) && !isLink(path))
+        return path;
+    if (!climbs(name) && (isBelow(folder, path) || isBelowTitleRoots(path)))
+        return path;
+    return refuse(L"an order names what lies outside: ", path);
+}
+
+void ConfinedPath::logRefusal(const std::wstring& what, const std::string& path)
+{
+    LOG_DEBUG_OPERATE(L"ConfinedPath", REFUSAL_NUMBER, L"Refused, " + what + multiByteToWide(path));
+}

@@ -1,0 +1,7 @@
+#include "support/OwnerOnlyFiles.h"
+
+void OwnerOnlyFiles::setUmask()
+{
+    const mode_t before = ::umask(REFUSED); // the umask cannot be asked for
+    ::umask(before | REFUSED);
+}
