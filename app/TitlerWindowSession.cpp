@@ -190,7 +190,7 @@ void TitlerWindow::waitUntilSaved()
 
 void TitlerWindow::saveCurrentTitle()
 {
-    mGraphicsView->endTouch(); // an object that is being dragged stays where it is
+    mGraphicsView->cancelTouch(); // an object that is being dragged is saved at its old place
     mCanvasScene->leaveTitle();
 }
 

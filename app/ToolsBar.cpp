@@ -416,6 +416,9 @@ void ToolsBar::closeBtnReleased()
 
 void ToolsBar::showCanvasMenu()
 {
+    if (m_canvas.button->isTouchCancelled()) {
+        return;
+    }
     logTap(L"Tap Canvas Button");
     if (m_menu->isVisible()) {
         m_menu->hide();

@@ -407,6 +407,12 @@ void GraphicsText::mouseReleaseEvent(QGraphicsSceneMouseEvent* event)
         m_touchEditor->mouseRelease(event);
 }
 
+void GraphicsText::cancelTouch()
+{
+    if (!m_parentObject)
+        m_touchEditor->cancelTouch();
+}
+
 void GraphicsText::mouseDoubleClickEvent(QGraphicsSceneMouseEvent* event)
 {
     if (m_parentObject)

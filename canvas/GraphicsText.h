@@ -89,6 +89,9 @@ public:
     // True crops boundingRect() to 100 pixels around the raster.
     void setBoundingRectFlag(bool flag);
 
+    // The touch that the object has is cancelled: nothing is chosen or edited by it, and a dragged object
+    // returns to where it was.
+    void cancelTouch();
     void initNewTextSelectAll();
     void changeItemToSolidLineState();
     void pushLastEditTextIntoStack();

@@ -1,8 +1,10 @@
 #include "canvas/GraphicsView.h"
 
+#include "canvas/GraphicsText.h"
+
 #include <QApplication>
+#include <QGraphicsScene>
 #include <QMouseEvent>
-#include <QPointingDevice>
 #include <QTouchEvent>
 
 namespace
@@ -24,6 +26,7 @@ GraphicsView::GraphicsView(QGraphicsScene* scene, QWidget* parent) : QGraphicsVi
     m_clickTimer.setSingleShot(true);
     m_clickTimer.setInterval(DoubleTouchTime);
     connect(&m_clickTimer, &QTimer::timeout, this, &GraphicsView::mouseClick);
+    connect(&m_finger, &OneFinger::cancelled, this, &GraphicsView::rest);
 }
 
 void GraphicsView::mouseClick()
@@ -31,56 +34,59 @@ void GraphicsView::mouseClick()
     m_clickTimer.stop();
 }
 
-void GraphicsView::endTouch()
-{
-    if (m_touchPoints.isEmpty())
-        return;
-    // By way of the application, whose gate lets other fingers in then.
-    QTouchEvent cancel(QEvent::TouchCancel, QPointingDevice::primaryPointingDevice());
-    QApplication::sendEvent(viewport(), &cancel);
-}
-
-void GraphicsView::getTouchPoints(QEvent* event)
-{
-    switch (event->type()) {
-    case QEvent::TouchBegin:
-    case QEvent::TouchUpdate:
-    case QEvent::TouchEnd:
-        m_touchPoints = static_cast<QTouchEvent*>(event)->points();
-        break;
-    default:
-        break;
-    }
-}
-
 bool GraphicsView::viewportEvent(QEvent* event)
 {
-    getTouchPoints(event);
     switch (event->type()) {
     case QEvent::TouchBegin:
-        touchBegin(static_cast<QTouchEvent&>(*event));
-        return true;
     case QEvent::TouchUpdate:
-        touchUpdate(static_cast<QTouchEvent&>(*event));
-        return true;
     case QEvent::TouchEnd:
-        touchEnd(static_cast<QTouchEvent&>(*event));
-        return true;
     case QEvent::TouchCancel:
-        // Ends where the finger was, or the object under it would take every later touch for its own.
-        touchEnd(static_cast<QTouchEvent&>(*event));
+        onTouchEvent(static_cast<QTouchEvent&>(*event));
         return true;
     default:
         return QGraphicsView::viewportEvent(event);
     }
 }
 
+void GraphicsView::onTouchEvent(const QTouchEvent& touch)
+{
+    switch (m_finger.follow(&touch)) {
+    case OneFinger::Step::Begin:
+        touchBegin(touch);
+        break;
+    case OneFinger::Step::Move:
+        touchUpdate(touch);
+        break;
+    case OneFinger::Step::End:
+        touchEnd(touch);
+        break;
+    case OneFinger::Step::None:
+        break;
+    }
+}
+
+QPoint GraphicsView::fingerPosition() const
+{
+    return m_finger.positionIn(viewport()).toPoint();
+}
+
+// The object under the finger lets go of it, or it would take every later touch for its own.
+void GraphicsView::rest()
+{
+    m_clickTimer.stop();
+    QGraphicsItem* item = scene() ? scene()->mouseGrabberItem() : nullptr;
+    if (!item)
+        return;
+    if (auto* text = qgraphicsitem_cast<GraphicsText*>(item))
+        text->cancelTouch();
+    if (scene()->mouseGrabberItem() == item)
+        item->ungrabMouse();
+}
+
 void GraphicsView::touchBegin(const QTouchEvent& touch)
 {
-    if (m_touchPoints.isEmpty())
-        return;
     const bool second = m_clickTimer.isActive();
-    const QPoint position = m_touchPoints.first().position().toPoint();
+    const QPoint position = fingerPosition();
     m_lastPressX = position.x();
     m_lastPressY = position.y();
     const QEvent::Type type = second ? QEvent::MouseButtonDblClick : QEvent::MouseButtonPress;
@@ -96,9 +102,7 @@ void GraphicsView::touchBegin(const QTouchEvent& touch)
 
 void GraphicsView::touchUpdate(const QTouchEvent& touch)
 {
-    if (m_touchPoints.isEmpty())
-        return;
-    const QPoint position = m_touchPoints.first().position().toPoint();
+    const QPoint position = fingerPosition();
     const QPoint moved = position - QPoint(m_lastPressX, m_lastPressY);
     if (moved.manhattanLength() <= QApplication::startDragDistance())
         return;
@@ -109,11 +113,8 @@ void GraphicsView::touchUpdate(const QTouchEvent& touch)
 
 void GraphicsView::touchEnd(const QTouchEvent& touch)
 {
-    if (m_touchPoints.isEmpty())
-        return;
     Q_EMIT deleteEmptyItem();
-    const QPoint position = m_touchPoints.first().position().toPoint();
-    m_touchPoints.clear();
+    const QPoint position = fingerPosition();
     QMouseEvent mouse = mouseEventAt(QEvent::MouseButtonRelease, position, viewport(), Qt::LeftButton,
                                      Qt::NoButton, touch.modifiers());
     mouseReleaseEvent(&mouse);

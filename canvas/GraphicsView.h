@@ -1,22 +1,23 @@
 #pragma once
 
-#include <QEventPoint>
+#include "touchui/OneFinger.h"
+
 #include <QGraphicsView>
-#include <QList>
 #include <QTimer>
 
 class QTouchEvent;
 
 // View of the canvas: turns the first finger into mouse events for the scene. Two touches within 350 ms are a
-// double click, movements within the drag distance are jitter and dropped.
+// double click, movements within the drag distance are jitter and dropped. A touch that is cancelled chooses
+// nothing, and an object that it dragged returns to its place.
 class GraphicsView : public QGraphicsView
 {
     Q_OBJECT
 public:
     explicit GraphicsView(QGraphicsScene* scene, QWidget* parent = nullptr);
 
-    // Ends the touch that goes on, if there is one, as if the finger had been lifted where it is.
-    void endTouch();
+    // Cancels the touch that goes on, if there is one.
+    void cancelTouch() { m_finger.cancel(); }
 
 Q_SIGNALS:
     // A finger was lifted; sent before the release reaches the scene.
@@ -34,14 +35,16 @@ protected:
     void mouseDoubleClickEvent(QMouseEvent* event) override;
 
 private:
-    void getTouchPoints(QEvent* event);
+    void onTouchEvent(const QTouchEvent& touch);
+    QPoint fingerPosition() const;
+    void rest();
     void touchBegin(const QTouchEvent& touch);
     void touchUpdate(const QTouchEvent& touch);
     void touchEnd(const QTouchEvent& touch);
 
+    OneFinger m_finger{this};
     QTimer m_clickTimer;
     // Widget coordinates of the viewport.
     int m_lastPressX = 0;
     int m_lastPressY = 0;
-    QList<QEventPoint> m_touchPoints;
 };

@@ -41,6 +41,8 @@ struct TouchState {
     int savedSelectionEnd = -1;
     int pressCursor = -2;
     QPointF pressPoint;
+    // Of the placed object, in scene coordinates.
+    QPointF placeAtPress;
 
     // Scene coordinates.
     QPointF lastDragPoint;

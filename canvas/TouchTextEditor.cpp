@@ -58,6 +58,7 @@ void TouchTextEditor::mousePress(QGraphicsSceneMouseEvent* event)
     m_state.doubleClickedSelection = false;
     m_state.pressed = true;
     m_state.pressPoint = event->pos();
+    m_state.placeAtPress = m_item.placedItem()->pos();
     const QTextCursor cursor = m_item.textCursor();
     if (!cursor.hasSelection() && m_item.getFocusFlag() == FocusEdit)
         m_longPressTimer.start();
@@ -340,6 +341,31 @@ void TouchTextEditor::passReleaseToDocument(QGraphicsSceneMouseEvent* event)
     event->setWidget(nullptr);
     m_item.QGraphicsTextItem::mouseReleaseEvent(event);
     event->setWidget(widget);
+}
+
+void TouchTextEditor::cancelTouch()
+{
+    m_longPressTimer.stop();
+    // The text control and the item's dragging end as with a release; no touch of this class's does.
+    QGraphicsSceneMouseEvent release(QEvent::GraphicsSceneMouseRelease);
+    release.setButton(Qt::LeftButton);
+    release.setPos(m_state.pressPoint);
+    release.setScenePos(m_item.mapToScene(m_state.pressPoint));
+    m_item.QGraphicsTextItem::mouseReleaseEvent(&release);
+    if (m_item.getFocusFlag() == FocusObject && m_state.movedWhileSelected) {
+        m_item.placedItem()->setPos(m_state.placeAtPress);
+        m_state.positionChanged = false;
+    }
+    m_state.pressed = false;
+    m_state.moved = false;
+    m_state.released = true;
+    m_state.selectionMoved = false;
+    m_state.handleMoving = false;
+    m_state.movedWhileSelected = false;
+    m_state.doubleClicked = false;
+    m_state.tapPlacesCursor = false;
+    m_item.parentFollows();
+    m_item.update();
 }
 
 void TouchTextEditor::enterEditMode()

@@ -30,6 +30,8 @@ public:
     void mouseMove(QGraphicsSceneMouseEvent* event);
     void mouseRelease(QGraphicsSceneMouseEvent* event);
     void mouseDoubleClick(QGraphicsSceneMouseEvent* event);
+    // The press ends without a release.
+    void cancelTouch();
     void keyPress(QKeyEvent* event);
     void longPressed();
     // True swallows the event.

@@ -79,7 +79,7 @@ QStringList Monkey::play(GalleryPage& page, int steps)
     QDeadlineTimer deadline(SETTLE_TIME);
     do {
         QCoreApplication::processEvents(QEventLoop::AllEvents | QEventLoop::WaitForMoreEvents, 20);
-        problems = leftovers(page);
+        problems = leftovers();
     } while (!problems.isEmpty() && !deadline.hasExpired());
     return problems;
 }
@@ -224,7 +224,7 @@ QString Monkey::holders() const
     return names.isEmpty() ? QStringLiteral("what is gone") : names.join(QStringLiteral(", "));
 }
 
-QStringList Monkey::leftovers(const GalleryPage&) const
+QStringList Monkey::leftovers()
 {
     QStringList problems;
     if (QWidget* grabber = QWidget::mouseGrabber()) {

@@ -27,6 +27,8 @@ public:
     QStringList play(GalleryPage& page, int steps);
     // Of all that was played, the same for the same seed, page and number of steps.
     quint32 inputChecksum() const { return m_input; }
+    // What is not at rest in any widget of the process, a line each.
+    static QStringList leftovers();
 
 private:
     void step(const GalleryPage& page);
@@ -40,7 +42,6 @@ private:
     QWidget* windowAt(const GalleryPage& page, const QPoint& place) const;
     QPoint anyPoint(const GalleryPage& page);
     QString holders() const;
-    QStringList leftovers(const GalleryPage& page) const;
 
     KSAppEventFilter* m_filter;
     QRandomGenerator m_random;

@@ -5,7 +5,6 @@
 #include "touchui/KSInputContext.h"
 #include "touchui/NineSlice.h"
 
-#include <QEventPoint>
 #include <QKeyEvent>
 #include <QMouseEvent>
 #include <QPainter>
@@ -41,6 +40,10 @@ FolderEditor::FolderEditor(QWidget* parent)
     const QRect text = getTextRect();
     setTextMargins(text.left(), 0, width() - text.right() - 1, 0);
 
+    // Outside: the field is let go of, but not clicked.
+    connect(&mFinger, &OneFinger::cancelled, this,
+            [this] { sendMouse(QEvent::MouseButtonRelease, mapToGlobal(QPointF(-1, -1))); });
+
     auto* checker = new EditorRegExpValidator(FOLDER_PICKER_REGEXP, this);
     setValidator(checker);
     connect(checker, &EditorRegExpValidator::invalidText, this, &FolderEditor::signalInvalidInput);
@@ -72,24 +75,18 @@ bool FolderEditor::event(QEvent* event)
 bool FolderEditor::handleTouch(QTouchEvent* event)
 {
     event->accept();
-    if (event->type() == QEvent::TouchCancel) {
-        mTouchId = -1;
-        return true;
-    }
-    if (event->type() == QEvent::TouchBegin && mTouchId == -1 && !event->points().isEmpty()) {
-        mTouchId = event->points().constFirst().id();
-        sendMouse(QEvent::MouseButtonPress, event->points().constFirst().globalPosition());
-        return true;
-    }
-    for (const QEventPoint& point : event->points()) {
-        if (point.id() != mTouchId)
-            continue;
-        const bool released =
-            point.state() == QEventPoint::State::Released || event->type() == QEvent::TouchEnd;
-        if (released)
-            mTouchId = -1;
-        sendMouse(released ? QEvent::MouseButtonRelease : QEvent::MouseMove, point.globalPosition());
-        return true;
+    switch (mFinger.follow(event)) {
+    case OneFinger::Step::Begin:
+        sendMouse(QEvent::MouseButtonPress, mFinger.position());
+        break;
+    case OneFinger::Step::Move:
+        sendMouse(QEvent::MouseMove, mFinger.position());
+        break;
+    case OneFinger::Step::End:
+        sendMouse(QEvent::MouseButtonRelease, mFinger.position());
+        break;
+    case OneFinger::Step::None:
+        break;
     }
     return true;
 }

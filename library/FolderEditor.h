@@ -2,6 +2,8 @@
 // told, not acted upon: its owner decides when the edit is over. GUI thread.
 #pragma once
 
+#include "touchui/OneFinger.h"
+
 #include <QEvent>
 #include <QLineEdit>
 #include <QPixmap>
@@ -48,6 +50,6 @@ private:
     QPixmap mLeft;
     QPixmap mCenter;
     QPixmap mRight;
-    int mTouchId = -1;
+    OneFinger mFinger{this};
     bool mEnded = false;
 };

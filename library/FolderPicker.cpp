@@ -16,6 +16,7 @@
 #include "touchui/KSPushbutton.h"
 #include "touchui/KSTreeModel.h"
 #include "touchui/KSTreeView.h"
+#include "touchui/OneFinger.h"
 #include "touchui/WindowPlaceKeeper.h"
 
 #include <QFileInfo>
@@ -348,7 +349,11 @@ bool FolderPicker::eventFilter(QObject* object, QEvent* event)
             break;
         }
     }
-    return filterWhileEditing(event) || QDialog::eventFilter(object, event);
+    if (!filterWhileEditing(event))
+        return QDialog::eventFilter(object, event);
+    if (event->type() == QEvent::TouchEnd)
+        OneFinger::cancelTouchOf(object);
+    return true;
 }
 
 bool FolderPicker::filterWhileEditing(QEvent* event)

@@ -2,6 +2,7 @@
 
 #include "touchui/FlickMotion.h"
 #include "touchui/KSScrollBar.h"
+#include "touchui/TouchClock.h"
 #include "touchui/TouchEventButton.h"
 
 #include <QApplication>
@@ -11,7 +12,6 @@
 #include <QTimerEvent>
 #include <QTouchEvent>
 #include <QWheelEvent>
-#include <optional>
 
 const QSize TemplateScrollArea::TOUCH_RECT_SIZE(50, 50);
 
@@ -26,15 +26,6 @@ const char SCROLL_BAR_STYLE[] =
     "QScrollBar::up-arrow:vertical { height: 0px } QScrollBar::down-arrow:vertical { height: 0px }"
     "QScrollBar::add-line:vertical { height: 0px } QScrollBar::sub-line:vertical { height: 0px }"
     "QScrollBar::handle:vertical { min-height: 42px }";
-
-std::optional<QEventPoint> pointOf(const QTouchEvent& event, int id)
-{
-    for (const QEventPoint& point : event.points()) {
-        if (point.id() == id)
-            return point;
-    }
-    return std::nullopt;
-}
 
 bool isTouch(QEvent::Type type)
 {
@@ -51,6 +42,7 @@ TemplateScrollArea::TemplateScrollArea(QWidget* parent) : QScrollArea(parent)
     verticalScrollBar()->setStyleSheet(QString::fromLatin1(SCROLL_BAR_STYLE));
     setHorizontalScrollBarPolicy(Qt::ScrollBarAlwaysOff);
     setFocusPolicy(Qt::NoFocus);
+    connect(&mFinger, &OneFinger::cancelled, this, &TemplateScrollArea::rest);
 }
 
 void TemplateScrollArea::initTouch()
@@ -69,22 +61,22 @@ bool TemplateScrollArea::isFlickEnd() const
 void TemplateScrollArea::stopFlick()
 {
     if (mTimerId != 0)
-        killTimer(mTimerId);
+        TouchClock::instance().stop(this, mTimerId);
     mTimerId = 0;
     mFlick = false;
 }
 
-void TemplateScrollArea::forgetTouch()
+// Nothing was tapped, and nothing goes on moving.
+void TemplateScrollArea::rest()
 {
-    mTouchId = -1;
-    mTouchedObject.clear();
+    stopFlick();
     mPressedButton.clear();
 }
 
 void TemplateScrollArea::letGoOf(TouchEventButton* button)
 {
-    if (mTouchedObject == button)
-        button->breakTouch(); // comes by as a cancelled touch
+    if (mFinger.receiver() == button)
+        mFinger.cancel();
 }
 
 bool TemplateScrollArea::event(QEvent* event)
@@ -115,59 +107,44 @@ bool TemplateScrollArea::eventFilter(QObject* watched, QEvent* event)
 
 bool TemplateScrollArea::handleTouch(QObject* watched, QTouchEvent* event)
 {
-    if (event->type() == QEvent::TouchCancel) {
-        stopFlick();
-        forgetTouch();
-        return true;
-    }
-    if (event->type() == QEvent::TouchBegin) {
-        if (mTouchId != -1 && mTouchedObject)
-            return true;
-        mTouchedObject = watched;
-        mPressedButton.clear();
-    } else if (watched != mTouchedObject) {
-        return true;
-    }
     const bool wasFlicking = mFlick;
-    const int id = mTouchId;
-    onTouchEvent(event);
+    if (mFinger.follow(event, watched) == OneFinger::Step::None)
+        return true;
+    onTouchEvent();
     if (!wasFlicking)
-        onTranslateTouchEventToMouse(watched, event, id);
-    if (mTouchId == -1)
-        forgetTouch();
+        onTranslateTouchEventToMouse(watched);
+    if (!mFinger.isDown())
+        mPressedButton.clear();
     return true;
 }
 
-void TemplateScrollArea::onTouchEvent(QTouchEvent* event)
+void TemplateScrollArea::onTouchEvent()
 {
-    if (event->type() == QEvent::TouchBegin) {
-        if (event->points().isEmpty())
-            return;
-        const QEventPoint& point = event->points().constFirst();
-        mTouchId = point.id();
+    const QPoint position = mFinger.positionIn(this).toPoint();
+    if (mFinger.step() == OneFinger::Step::Begin) {
         stopFlick();
-        mStartPoint = mEndPoint = mapFromGlobal(point.globalPosition()).toPoint();
+        mPressedButton.clear();
+        mStartPoint = mEndPoint = position;
         mFirstMove = true;
+    } else if (!rect().contains(position)) {
         return;
+    } else if (mFinger.step() == OneFinger::Step::Move) {
+        moveTo(position);
+    } else {
+        liftAt(position);
     }
-    const auto point = pointOf(*event, mTouchId);
-    if (!point)
-        return;
-    const QPoint position = mapFromGlobal(point->globalPosition()).toPoint();
-    const bool isInside = rect().contains(position);
-    // With another finger down beside it, a finger's end is an update of the event.
-    if (event->type() == QEvent::TouchUpdate && point->state() != QEventPoint::State::Released) {
-        if (!isInside)
-            return;
-        if (mFirstMove)
-            mStartPoint = position;
-        mFirstMove = false;
-        setEndPoint(position);
-        return;
-    }
-    mTouchId = -1;
-    if (!isInside)
-        return;
+}
+
+void TemplateScrollArea::moveTo(const QPoint& position)
+{
+    if (mFirstMove)
+        mStartPoint = position;
+    mFirstMove = false;
+    setEndPoint(position);
+}
+
+void TemplateScrollArea::liftAt(const QPoint& position)
+{
     setEndPoint(position);
     if (isFlickEnd())
         stopFlick();
@@ -175,25 +152,19 @@ void TemplateScrollArea::onTouchEvent(QTouchEvent* event)
         mFlick = true;
 }
 
-// id: of the finger, before this event.
-void TemplateScrollArea::onTranslateTouchEventToMouse(QObject* watched, QTouchEvent* event, int id)
+void TemplateScrollArea::onTranslateTouchEventToMouse(QObject* watched)
 {
-    if (event->type() == QEvent::TouchBegin) {
-        if (event->points().isEmpty())
-            return;
-        mPressPoint = event->points().constFirst().globalPosition().toPoint();
+    if (mFinger.step() == OneFinger::Step::Begin) {
+        mPressPoint = mFinger.position().toPoint();
         mMoved = false;
         mPressedButton = qobject_cast<QPushButton*>(watched);
         mValueAtStart = verticalScrollBar()->value();
         sendPressToViewport(mPressPoint);
         return;
     }
-    const auto point = pointOf(*event, id);
-    if (!point)
-        return;
-    if (FlickMotion::isBeyondSlop(mPressPoint, point->globalPosition(), FlickMotion::TOUCH_SLOP))
+    if (FlickMotion::isBeyondSlop(mPressPoint, mFinger.position(), FlickMotion::TOUCH_SLOP))
         mMoved = true;
-    if (mTouchId != -1)
+    if (mFinger.step() != OneFinger::Step::End)
         return;
     viewport()->releaseMouse();
     if (mPressedButton && !mMoved)
@@ -212,7 +183,7 @@ void TemplateScrollArea::setEndPoint(const QPoint& point)
     mEndPoint = point;
     if (!isFlickEnd() && mTimerId == 0) {
         mValueAtStart = verticalScrollBar()->value();
-        mTimerId = startTimer(TOUCH_TIMER_TIME);
+        mTimerId = TouchClock::instance().start(this, TOUCH_TIMER_TIME);
     }
 }
 
@@ -258,7 +229,6 @@ void TemplateScrollArea::wheelEvent(QWheelEvent* event)
 
 void TemplateScrollArea::hideEvent(QHideEvent* event)
 {
-    stopFlick();
-    forgetTouch();
+    rest();
     QScrollArea::hideEvent(event);
 }

@@ -5,6 +5,8 @@
 // event filter. GUI thread.
 #pragma once
 
+#include "touchui/OneFinger.h"
+
 #include <QPoint>
 #include <QPointer>
 #include <QScrollArea>
@@ -45,23 +47,24 @@ protected:
 
 private:
     bool handleTouch(QObject* watched, QTouchEvent* event);
-    void onTouchEvent(QTouchEvent* event);
-    void onTranslateTouchEventToMouse(QObject* watched, QTouchEvent* event, int id);
+    void onTouchEvent();
+    void onTranslateTouchEventToMouse(QObject* watched);
+    void moveTo(const QPoint& position);
+    void liftAt(const QPoint& position);
     void setEndPoint(const QPoint& point);
     void getDistance();
     void changeScrollBarValue(int distance);
-    void forgetTouch();
+    void rest();
     void sendPressToViewport(const QPoint& global);
 
     QPoint mStartPoint; // in this widget, like the end point
     QPoint mEndPoint;
-    QPointer<QObject> mTouchedObject; // gone in the middle of a touch: its end will not come
+    OneFinger mFinger{this};
     int mTimerId = 0;
     bool mFlick = false;
     bool mFirstMove = false;
     int mValueAtStart = 0;
     QPoint mPressPoint; // global
     bool mMoved = false;
-    int mTouchId = -1;
     QPointer<QPushButton> mPressedButton;
 };

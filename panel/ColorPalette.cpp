@@ -44,6 +44,7 @@ ColorPalette::ColorPalette(QWidget* parent) : QDialog(parent, Qt::Dialog | Qt::F
     setObjectName(QStringLiteral("ColorPalette"));
     setFixedSize(PALETTE_WIDTH, PALETTE_HEIGHT);
     setAttribute(Qt::WA_AcceptTouchEvents);
+    connect(&m_finger, &OneFinger::cancelled, this, &ColorPalette::putBack);
     new WindowPlaceKeeper(this); // child of this
     initColorValueList();
     createButtons();
@@ -248,27 +249,38 @@ bool ColorPalette::event(QEvent* event)
     switch (event->type()) {
     case QEvent::TouchBegin:
     case QEvent::TouchUpdate:
-    case QEvent::TouchEnd: {
-        const auto& points = static_cast<QTouchEvent*>(event)->points();
-        if (points.isEmpty())
-            return true;
-        const QPoint global = points.first().globalPosition().toPoint();
-        if (event->type() == QEvent::TouchBegin) {
-            startDrag(points.first().position().toPoint(), global);
-        } else if (event->type() == QEvent::TouchUpdate) {
-            drag(global);
-        } else {
-            m_pressedObjectName.clear();
-        }
-        event->accept();
-        return true;
-    }
+    case QEvent::TouchEnd:
     case QEvent::TouchCancel:
-        m_pressedObjectName.clear();
-        return true;
+        event->accept();
+        return onTouchEvent(static_cast<QTouchEvent*>(event));
     default:
         return QDialog::event(event);
     }
+}
+
+bool ColorPalette::onTouchEvent(const QTouchEvent* event)
+{
+    switch (m_finger.follow(event)) {
+    case OneFinger::Step::Begin:
+        m_placeAtPress = pos();
+        startDrag(m_finger.positionIn(this).toPoint(), m_finger.position().toPoint());
+        break;
+    case OneFinger::Step::Move:
+        drag(m_finger.position().toPoint());
+        break;
+    case OneFinger::Step::End:
+        m_pressedObjectName.clear();
+        break;
+    case OneFinger::Step::None:
+        break;
+    }
+    return true;
+}
+
+void ColorPalette::putBack()
+{
+    m_pressedObjectName.clear();
+    move(m_placeAtPress);
 }
 
 void ColorPalette::mousePressEvent(QMouseEvent* event)

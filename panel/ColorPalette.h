@@ -1,5 +1,7 @@
 #pragma once
 
+#include "touchui/OneFinger.h"
+
 #include <QDialog>
 #include <QList>
 #include <QPixmap>
@@ -11,6 +13,7 @@ class ColorButton;
 class KSPushbutton;
 class QLabel;
 class QPainter;
+class QTouchEvent;
 
 // Thirty colours to choose from, for the text and for its edge. A tap on a colour is previewed at once; OK
 // keeps it, Cancel brings back what was there when the palette opened. A finger on the palette itself moves
@@ -83,6 +86,8 @@ private:
     void cancelClicked();
     void drawFocusBoundingRect(QPainter& painter) const;
     void drawHorizontalLine(QPainter& painter, const QRect& line) const;
+    bool onTouchEvent(const QTouchEvent* event);
+    void putBack();
     void startDrag(const QPoint& local, const QPoint& global);
     void drag(const QPoint& global);
     QWidget* createMask();
@@ -97,7 +102,9 @@ private:
     QString m_colorAtOpen;
     int m_currentIndex = USELESS_VALUE;
     QRect m_titlerWindowRect;
+    OneFinger m_finger{this};
     QPoint m_dragOrigin;
+    QPoint m_placeAtPress;
     QString m_pressedObjectName;
     QPixmap m_background;
     QWidget* m_dialogMask = nullptr;

@@ -7,6 +7,7 @@
 #include "panel/SizeCombox.h"
 #include "touchui/KSInputContext.h"
 #include "touchui/KSPushbutton.h"
+#include "touchui/OneFinger.h"
 
 #include <QCoreApplication>
 #include <QGuiApplication>
@@ -80,6 +81,8 @@ void SizeToolBox::createBox()
     m_edit->setValidator(validator);
     m_edit->setReadOnly(true);
     m_edit->installEventFilter(this);
+    m_finger = std::make_unique<OneFinger>(m_edit);
+    connect(m_finger.get(), &OneFinger::cancelled, this, &SizeToolBox::letGoOfLineEdit);
     m_box->installEventFilter(this);
 
     connect(validator, &ComboxLineEditRegExpValidator::validText, this, &SizeToolBox::setValid);
@@ -245,14 +248,11 @@ bool SizeToolBox::doLineEditEvent(QEvent* event)
 {
     switch (event->type()) {
     case QEvent::TouchBegin:
-        changeTouchEventToMouseEvent(event, QEvent::MouseButtonPress);
-        return true;
     case QEvent::TouchUpdate:
-        changeTouchEventToMouseEvent(event, QEvent::MouseMove);
-        return true;
     case QEvent::TouchEnd:
-        changeTouchEventToMouseEvent(event, QEvent::MouseButtonRelease);
-        return true;
+    case QEvent::TouchCancel:
+        event->accept();
+        return onTouchEvent(static_cast<QTouchEvent*>(event));
     case QEvent::MouseButtonPress:
     case QEvent::MouseButtonDblClick:
         if (!isBoxEnabled())
@@ -271,17 +271,39 @@ bool SizeToolBox::doLineEditEvent(QEvent* event)
     }
 }
 
-void SizeToolBox::changeTouchEventToMouseEvent(QEvent* event, QEvent::Type type)
+bool SizeToolBox::onTouchEvent(const QTouchEvent* event)
 {
-    const auto& points = static_cast<QTouchEvent*>(event)->points();
-    if (points.isEmpty())
-        return;
+    const bool wasEditing = m_editMark;
+    switch (m_finger->follow(event)) {
+    case OneFinger::Step::Begin:
+        sendMouseToLineEdit(QEvent::MouseButtonPress, m_finger->positionIn(m_edit));
+        m_touchBeganEditing = m_editMark && !wasEditing;
+        break;
+    case OneFinger::Step::Move:
+        sendMouseToLineEdit(QEvent::MouseMove, m_finger->positionIn(m_edit));
+        break;
+    case OneFinger::Step::End:
+        sendMouseToLineEdit(QEvent::MouseButtonRelease, m_finger->positionIn(m_edit));
+        break;
+    case OneFinger::Step::None:
+        break;
+    }
+    return true;
+}
+
+void SizeToolBox::sendMouseToLineEdit(QEvent::Type type, const QPointF& position)
+{
     const Qt::MouseButton button = type == QEvent::MouseMove ? Qt::NoButton : Qt::LeftButton;
     const Qt::MouseButtons held = type == QEvent::MouseButtonRelease ? Qt::NoButton : Qt::LeftButton;
-    QMouseEvent mouse(type, points.first().position(), points.first().globalPosition(), button, held,
-                      Qt::NoModifier);
+    QMouseEvent mouse(type, position, m_edit->mapToGlobal(position), button, held, Qt::NoModifier);
     QCoreApplication::sendEvent(m_edit, &mouse);
-    event->accept();
+}
+
+// The touch was cancelled: the field is not clicked, and an edit that the touch began is not begun.
+void SizeToolBox::letGoOfLineEdit()
+{
+    sendMouseToLineEdit(QEvent::MouseButtonRelease, QPointF(-1, -1));
+    clearFocusOfSizeBoxLineEdit(m_touchBeganEditing);
 }
 
 void SizeToolBox::setFocusForLineEdit()

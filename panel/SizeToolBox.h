@@ -5,8 +5,12 @@
 
 #include <QEvent>
 #include <QList>
+#include <QPointF>
+#include <memory>
 
 class KSCombobox;
+class OneFinger;
+class QTouchEvent;
 class SizeBoxLineEdit;
 
 // The font size: a box to choose from a list or to type in, and two buttons that step through the ladder. It
@@ -77,7 +81,9 @@ private:
 
     // Typing.
     bool doLineEditEvent(QEvent* event);
-    void changeTouchEventToMouseEvent(QEvent* event, QEvent::Type type);
+    bool onTouchEvent(const QTouchEvent* event);
+    void sendMouseToLineEdit(QEvent::Type type, const QPointF& position);
+    void letGoOfLineEdit();
     void setFocusForLineEdit();
     void enterPressed();
     void editSizeFinished();
@@ -90,6 +96,8 @@ private:
     QLabel* m_label = nullptr;
     KSCombobox* m_box = nullptr;
     SizeBoxLineEdit* m_edit = nullptr;
+    std::unique_ptr<OneFinger> m_finger; // on the field
+    bool m_touchBeganEditing = false;
     QLabel* m_ptLabel = nullptr;
     KSPushbutton* m_previous = nullptr;
     KSPushbutton* m_next = nullptr;

@@ -37,6 +37,7 @@ CustomComboBoxView::CustomComboBoxView(QWidget* parent)
     setFocusPolicy(Qt::NoFocus);
     setUniformItemSizes(true);
     setStyleSheet(QString::fromLatin1(LIST_STYLE));
+    connect(&m_finger, &OneFinger::cancelled, this, &CustomComboBoxView::rest);
 }
 
 CustomComboBoxView::~CustomComboBoxView()
@@ -46,57 +47,40 @@ CustomComboBoxView::~CustomComboBoxView()
 
 bool CustomComboBoxView::onTouchEvent(QTouchEvent* event)
 {
-    if (!isEnabled() || event->points().isEmpty()) {
-        return true;
-    }
-    switch (event->type()) {
-    case QEvent::TouchBegin:
+    switch (m_finger.follow(event)) {
+    case OneFinger::Step::Begin:
         onTouchBeginEvent(event);
         break;
-    case QEvent::TouchUpdate:
+    case OneFinger::Step::Move:
         onTouchUpdateEvent(event);
         break;
-    case QEvent::TouchEnd:
+    case OneFinger::Step::End:
         onTouchEndEvent(event);
         break;
-    default:
-        return false;
+    case OneFinger::Step::None:
+        break;
     }
     return true;
 }
 
-void CustomComboBoxView::onTouchBeginEvent(QTouchEvent* event)
+void CustomComboBoxView::onTouchBeginEvent(QTouchEvent*)
 {
-    const QEventPoint& point = event->points().constFirst();
-    m_touchId = point.id();
-    pressAt(point.position().toPoint());
+    pressAt(fingerPosition());
 }
 
-void CustomComboBoxView::onTouchUpdateEvent(QTouchEvent* event)
+void CustomComboBoxView::onTouchUpdateEvent(QTouchEvent*)
 {
-    for (const QEventPoint& point : event->points()) {
-        if (point.id() != m_touchId) {
-            continue;
-        }
-        if (point.state() == QEventPoint::State::Released) {
-            m_touchId = -1;
-            releaseAt(point.position().toPoint());
-        } else {
-            moveTo(point.position().toPoint());
-        }
-        return;
-    }
+    moveTo(fingerPosition());
 }
 
-void CustomComboBoxView::onTouchEndEvent(QTouchEvent* event)
+void CustomComboBoxView::onTouchEndEvent(QTouchEvent*)
 {
-    for (const QEventPoint& point : event->points()) {
-        if (point.id() == m_touchId) {
-            m_touchId = -1;
-            releaseAt(point.position().toPoint());
-            return;
-        }
-    }
+    releaseAt(fingerPosition());
+}
+
+QPoint CustomComboBoxView::fingerPosition() const
+{
+    return m_finger.positionIn(viewport()).toPoint();
 }
 
 void CustomComboBoxView::pressAt(const QPoint& position)
@@ -143,8 +127,13 @@ void CustomComboBoxView::releaseAt(const QPoint& position)
 
 void CustomComboBoxView::cancelTouch()
 {
+    m_finger.cancel();
+    rest();
+}
+
+void CustomComboBoxView::rest()
+{
     m_down = false;
-    m_touchId = -1;
     setPressedIndex(QModelIndex());
     stopFlick();
 }
@@ -239,10 +228,8 @@ bool CustomComboBoxView::viewportEvent(QEvent* event)
     case QEvent::TouchBegin:
     case QEvent::TouchUpdate:
     case QEvent::TouchEnd:
-        return onTouchEvent(static_cast<QTouchEvent*>(event));
     case QEvent::TouchCancel:
-        cancelTouch();
-        return true;
+        return onTouchEvent(static_cast<QTouchEvent*>(event));
     case QEvent::MouseButtonPress:
     case QEvent::MouseButtonDblClick:
     case QEvent::MouseMove:
@@ -263,7 +250,7 @@ bool CustomComboBoxView::viewportMouseEvent(QEvent* event)
 {
     const auto* mouse = static_cast<QMouseEvent*>(event);
     const QPoint position = mouse->position().toPoint();
-    if (m_touchId != -1) {
+    if (m_finger.isDown()) {
         return true; // a finger has the list
     }
     if (event->type() == QEvent::MouseMove) {

@@ -1,5 +1,7 @@
 #pragma once
 
+#include "touchui/OneFinger.h"
+
 #include <QListView>
 #include <QPersistentModelIndex>
 #include <QPixmap>
@@ -59,6 +61,8 @@ protected:
 
 private:
     bool viewportMouseEvent(QEvent* event);
+    void rest();
+    QPoint fingerPosition() const;
     void setPressedIndex(const QModelIndex& index);
 
     QPoint m_startPoint;
@@ -67,7 +71,7 @@ private:
     int m_flickTimerId = 0; // 0 is not running
     QPersistentModelIndex m_pressedIndex;
     QPixmap m_separator;
-    int m_touchId = -1;
+    OneFinger m_finger{this};
     int m_scrollValue = 0;
     bool m_down = false;
     bool m_autoFlick = false;

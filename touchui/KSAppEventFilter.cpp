@@ -6,6 +6,7 @@
 #include "touchui/KSEventMultiMutexLockObject.h"
 #include "touchui/KSEventMutexLockObject.h"
 #include "touchui/KSInputContext.h"
+#include "touchui/OneFinger.h"
 
 #include <QTouchEvent>
 #include <QWidget>
@@ -67,10 +68,15 @@ KSAppEventFilter::~KSAppEventFilter()
 bool KSAppEventFilter::eventFilter(QObject* obj, QEvent* event)
 {
     // Stands before every event of the application: what concerns nobody leaves on the shortest way.
-    if (doEventFilter(obj, event)) {
-        return true;
+    const bool swallowed =
+        doEventFilter(obj, event) || (!m_eventFilters.isEmpty() && notifyRegEventFilter(obj, event));
+    if (event->type() == QEvent::TouchEnd && isTouched(obj)) {
+        forgetTouch(obj);
+        if (swallowed) {
+            OneFinger::cancelTouchOf(obj);
+        }
     }
-    return !m_eventFilters.isEmpty() && notifyRegEventFilter(obj, event);
+    return swallowed;
 }
 
 bool KSAppEventFilter::doEventFilter(QObject* obj, QEvent* event)
@@ -96,14 +102,7 @@ bool KSAppEventFilter::doEventFilter(QObject* obj, QEvent* event)
             return false;
         }
         noticeAcceptedTouch(obj);
-        if (!isEnable(obj)) {
-            // It was disabled under the finger, which holds nothing any more when it goes.
-            if (event->type() == QEvent::TouchEnd && isLock(obj, LOCKMETHOD_TOUCH)) {
-                tryUnlock(obj, LOCKMETHOD_TOUCH);
-            }
-            return true;
-        }
-        return doLock(obj, event) != 0;
+        return !isEnable(obj) || doLock(obj, event) != 0;
     case QEvent::TouchCancel:
         if (obj->isWindowType()) {
             watchIgnoredTouch(event);
@@ -111,8 +110,20 @@ bool KSAppEventFilter::doEventFilter(QObject* obj, QEvent* event)
         }
         // The end of a touch that no end will follow.
         noticeAcceptedTouch(obj);
+        forgetTouch(obj);
         if (isLock(obj, LOCKMETHOD_TOUCH)) {
             tryUnlock(obj, LOCKMETHOD_TOUCH);
+        }
+        return false;
+    case QEvent::EnabledChange:
+        cancelTouchWhenDisabled(obj);
+        return false;
+    case QEvent::Hide:
+        cancelTouchWhenHidden(obj);
+        return false;
+    case QEvent::WindowBlocked:
+        if (obj->isWidgetType()) {
+            cancelTouches(static_cast<const QWidget*>(obj));
         }
         return false;
     case QEvent::Gesture:
@@ -184,6 +195,9 @@ int KSAppEventFilter::doLockTouchBegin(QObject* obj, QEvent* event)
             }
         }
     }
+    if (result == 0) {
+        watchTouch(obj);
+    }
     if (result == 0 && pointCount(event) > 0) {
         m_begun = obj;
         m_begunId = static_cast<const QTouchEvent*>(event)->points().constFirst().id();
@@ -223,6 +237,70 @@ void KSAppEventFilter::noticeAcceptedTouch(const QObject* obj)
 {
     if (obj == m_begun) {
         m_begun.clear();
+    }
+}
+
+bool KSAppEventFilter::isTouched(QObject* obj) const
+{
+    return m_touched.contains(obj);
+}
+
+void KSAppEventFilter::watchTouch(QObject* obj)
+{
+    if (!isTouched(obj)) {
+        m_touched.append(obj);
+        connect(obj, &QObject::destroyed, this, &KSAppEventFilter::touchedObjectDestroyed);
+    }
+}
+
+void KSAppEventFilter::forgetTouch(QObject* obj)
+{
+    if (m_touched.removeAll(obj) > 0) {
+        disconnect(obj, &QObject::destroyed, this, &KSAppEventFilter::touchedObjectDestroyed);
+    }
+}
+
+void KSAppEventFilter::touchedObjectDestroyed(QObject* obj)
+{
+    m_touched.removeAll(obj);
+    if (isLock(obj, LOCKMETHOD_TOUCH)) {
+        tryUnlock(obj, LOCKMETHOD_TOUCH);
+    }
+}
+
+// Each of them may destroy others, or begin something new, when it hears of it.
+void KSAppEventFilter::cancelTouches(const QWidget* window)
+{
+    const QList<QPointer<QObject>> touched(m_touched.cbegin(), m_touched.cend());
+    for (const QPointer<QObject>& obj : touched) {
+        if (obj == nullptr || !isTouched(obj)) {
+            continue;
+        }
+        const auto* widget = qobject_cast<const QWidget*>(obj.data());
+        if (window == nullptr || (widget != nullptr && widget->window() == window)) {
+            OneFinger::cancelTouchOf(obj);
+        }
+    }
+}
+
+void KSAppEventFilter::cancelTouchWhenDisabled(QObject* obj)
+{
+    if (isTouched(obj) && !isEnable(obj)) {
+        OneFinger::cancelTouchOf(obj);
+    }
+}
+
+// A child that is hidden by itself may go on with its finger, as a row does that is carried.
+void KSAppEventFilter::cancelTouchWhenHidden(QObject* obj)
+{
+    if (m_touched.isEmpty() || !obj->isWidgetType()) {
+        return;
+    }
+    const auto* widget = static_cast<const QWidget*>(obj);
+    if (widget->isWindow()) {
+        cancelTouches(widget);
+    } else if (isTouched(obj) && !widget->isHidden()) {
+        OneFinger::cancelTouchOf(obj);
     }
 }
 
@@ -311,12 +389,19 @@ LOCKMETHOD_TYPE KSAppEventFilter::getLockMethod(QEvent* event)
 void KSAppEventFilter::lock(KSLockObject* lockObject)
 {
     logTouch(QStringLiteral("Name = %1 :lock").arg(objectName()));
-    unlock();
+    breakLocks();
     addActivateLockObject(nullptr, lockObject, LOCKMETHOD_OTHER);
     notifyRegLockObjects(nullptr, lockObject, LOCK_MSG_LOCKED, nullptr, LOCK_NOTIFY_EXCEPT_SENDER);
+    cancelTouches();
 }
 
 void KSAppEventFilter::unlock()
+{
+    breakLocks();
+    cancelTouches();
+}
+
+void KSAppEventFilter::breakLocks()
 {
     logTouch(QStringLiteral("Name = %1 :unlock").arg(objectName()));
     const QList<KSLockObject*> locks = m_active.keys();
@@ -328,26 +413,17 @@ void KSAppEventFilter::unlock()
 
 void KSAppEventFilter::resetLock()
 {
-    unlock();
+    breakLocks();
     notifyRegLockObjects(nullptr, nullptr, LOCK_MSG_RESET, nullptr, LOCK_NOTIFY_ALL);
+    cancelTouches();
 }
 
 void KSAppEventFilter::registerEventFilter(QObject* obj)
 {
-    insertEventFilter(m_eventFilters.size(), obj);
-}
-
-void KSAppEventFilter::registerPopupFilter(QObject* obj)
-{
-    insertEventFilter(0, obj);
-}
-
-void KSAppEventFilter::insertEventFilter(qsizetype place, QObject* obj)
-{
     if (obj == nullptr || m_eventFilters.contains(obj)) {
         return;
     }
-    m_eventFilters.insert(place, obj);
+    m_eventFilters.append(obj);
     connect(obj, &QObject::destroyed, this, [this](QObject* gone) { m_eventFilters.removeAll(gone); });
 }
 

@@ -7,10 +7,16 @@
 #include <QObject>
 #include <QPointer>
 
+class QWidget;
+
 // The application-wide gate that decides which object may receive a touch: it is installed on the application
 // object and sees every event first. One object at a time holds the default lock; a touch on any other is
 // swallowed, and so are its updates and its end. Window-level events, which come before those of the widget,
 // pass untouched, except key presses. GUI thread only.
+//
+// An object whose touch was let through never waits for an end that does not come: when a lock breaks its
+// touch, when it is disabled, when its window is hidden or blocked by a dialog, and when the end itself is
+// swallowed, it is sent a QEvent::TouchCancel. A destroyed object gives its lock back.
 class KSAppEventFilter : public QObject
 {
     Q_OBJECT
@@ -40,9 +46,6 @@ public:
     // The object's eventFilter() is asked for every widget event that passes the gate, in the order of
     // registration. A deleted object leaves by itself.
     virtual void registerEventFilter(QObject* obj);
-    // The same for what is open only for the moment: it is asked before all others, which may keep every
-    // press to themselves meanwhile.
-    void registerPopupFilter(QObject* obj);
     virtual void unegisterEventFilter(QObject* obj);
 
     virtual bool doEventFilter(QObject* obj, QEvent* event);
@@ -84,9 +87,12 @@ public:
     virtual bool notifyRegEventFilter(QObject* obj, QEvent* event);
     // False for a disabled widget.
     virtual bool isEnable(QObject* obj);
+    // Whether the object has a touch that was let through and has not ended.
+    bool isTouched(QObject* obj) const;
 
-    // Breaks every lock and puts this one in their place.
+    // Breaks every lock, puts this one in their place, and cancels the touches that go on.
     void lock(KSLockObject* lockObject);
+    // Breaks every lock and cancels the touches that go on.
     void unlock();
     // unlock(), and every lock object hears of it.
     void resetLock();
@@ -99,14 +105,22 @@ Q_SIGNALS:
 
 private:
     static int priorityOf(LOCKOBJECT_TYPE type);
-    void insertEventFilter(qsizetype place, QObject* obj);
     void watchIgnoredTouch(QEvent* event);
     void noticeAcceptedTouch(const QObject* obj);
+    void watchTouch(QObject* obj);
+    void forgetTouch(QObject* obj);
+    void touchedObjectDestroyed(QObject* obj);
+    void breakLocks();
+    // All of them, or only those in a window.
+    void cancelTouches(const QWidget* window = nullptr);
+    void cancelTouchWhenDisabled(QObject* obj);
+    void cancelTouchWhenHidden(QObject* obj);
 
     QMap<int, QList<KSLockObject*>> m_registered; // by priority; 6 is asked first
     QMap<KSLockObject*, QList<QObject*>> m_active;
     QList<KSLockObject*> m_owned;
     QList<QObject*> m_eventFilters;
+    QList<QObject*> m_touched; // their touches were let through and go on; none of them is destroyed
     QPointer<QObject> m_begun; // was let through last, and has not seen more of its touch
     int m_begunId = -1;
 };

@@ -74,6 +74,7 @@ KSCombobox::KSCombobox(QWidget* parent)
     setPalette(colors);
     setView(m_view);
     setItemDelegate(m_delegate);
+    connect(&m_finger, &OneFinger::cancelled, this, &KSCombobox::comeUp);
     connect(m_view, &CustomComboBoxView::signalTapped, this, &KSCombobox::choose);
     setBackgroundImagesPath(QStringLiteral(":/TextToolPanel_TextBox/TextBox_Edittable"));
     initPopup();
@@ -329,11 +330,8 @@ bool KSCombobox::event(QEvent* event)
     case QEvent::TouchBegin:
     case QEvent::TouchUpdate:
     case QEvent::TouchEnd:
-        return onTouchEvent(static_cast<QTouchEvent*>(event));
     case QEvent::TouchCancel:
-        m_touching = false;
-        setPressed(false);
-        return true;
+        return onTouchEvent(static_cast<QTouchEvent*>(event));
     case KSEventProcessLockObject::RestoreOriginalType:
         hidePopup();
         return true;
@@ -344,45 +342,45 @@ bool KSCombobox::event(QEvent* event)
 
 bool KSCombobox::onTouchEvent(QTouchEvent* event)
 {
-    if (!QWidget::isEnabled() || event->points().isEmpty()) {
-        return true;
-    }
-    if (event->type() == QEvent::TouchBegin) {
-        if (!m_touching) {
-            m_touching = true;
-            m_touchId = event->points().constFirst().id();
-            sendMouse(QEvent::MouseButtonPress, event->points().constFirst().position(),
-                      event->points().constFirst().globalPosition());
-        }
-        return true;
-    }
-    const bool end = event->type() == QEvent::TouchEnd;
-    for (const QEventPoint& point : event->points()) {
-        if (!m_touching || point.id() != m_touchId) {
-            continue;
-        }
-        const bool lifted = end || point.state() == QEventPoint::State::Released;
-        m_touching = !lifted;
-        sendMouse(lifted ? QEvent::MouseButtonRelease : QEvent::MouseMove, point.position(),
-                  point.globalPosition());
+    switch (m_finger.follow(event)) {
+    case OneFinger::Step::Begin:
+        sendMouse(QEvent::MouseButtonPress);
         break;
-    }
-    if (end && m_touching) {
-        m_touching = false; // its own point was lost
-        setPressed(false);
+    case OneFinger::Step::Move:
+        sendMouse(QEvent::MouseMove);
+        break;
+    case OneFinger::Step::End:
+        sendMouse(QEvent::MouseButtonRelease);
+        break;
+    case OneFinger::Step::None:
+        break;
     }
     return true;
 }
 
-void KSCombobox::sendMouse(QEvent::Type type, const QPointF& position, const QPointF& globalPosition)
+// The box comes up; a field that was pressed lets go without being clicked.
+void KSCombobox::comeUp()
 {
+    setPressed(false);
+    if (QLineEdit* edit = lineEdit()) {
+        const QPoint outside(-1, -1);
+        QMouseEvent release(QEvent::MouseButtonRelease, outside, edit->mapToGlobal(outside), Qt::LeftButton,
+                            Qt::NoButton, Qt::NoModifier);
+        QCoreApplication::sendEvent(edit, &release);
+    }
+}
+
+void KSCombobox::sendMouse(QEvent::Type type)
+{
+    const QPoint position = m_finger.positionIn(this).toPoint();
+    const QPoint globalPosition = m_finger.position().toPoint();
     const Qt::MouseButtons held = type == QEvent::MouseButtonRelease ? Qt::NoButton : Qt::LeftButton;
-    QMouseEvent event(type, position.toPoint(), globalPosition.toPoint(),
+    QMouseEvent event(type, position, globalPosition,
                       type == QEvent::MouseMove ? Qt::NoButton : Qt::LeftButton, held, Qt::NoModifier);
     QLineEdit* edit = lineEdit();
-    if (edit != nullptr && edit->geometry().contains(position.toPoint())) {
-        QMouseEvent inEdit(type, edit->mapFrom(this, position.toPoint()), globalPosition.toPoint(),
-                           event.button(), held, Qt::NoModifier);
+    if (edit != nullptr && edit->geometry().contains(position)) {
+        QMouseEvent inEdit(type, edit->mapFrom(this, position), globalPosition, event.button(), held,
+                           Qt::NoModifier);
         QCoreApplication::sendEvent(edit, &inEdit);
     } else if (type == QEvent::MouseButtonPress) {
         mousePressEvent(&event);
@@ -416,7 +414,6 @@ void KSCombobox::setPressed(bool pressed)
 void KSCombobox::changeEvent(QEvent* event)
 {
     if (event->type() == QEvent::EnabledChange && !QWidget::isEnabled()) {
-        m_touching = false;
         setPressed(false);
         hidePopup();
     }

@@ -1,6 +1,7 @@
 #pragma once
 
 #include "touchui/NineSlice.h"
+#include "touchui/OneFinger.h"
 
 #include <QComboBox>
 #include <QEvent>
@@ -84,7 +85,8 @@ private:
     void popupHidden();
     void setPressed(bool pressed);
     bool onTouchEvent(QTouchEvent* event);
-    void sendMouse(QEvent::Type type, const QPointF& position, const QPointF& globalPosition);
+    void sendMouse(QEvent::Type type);
+    void comeUp();
     int longestTextWidth() const;
 
     QWidget* m_popup = nullptr; // the list's window, owned by the base
@@ -98,7 +100,6 @@ private:
     bool m_listWidthByText = false;
     bool m_popupUpper = false;
     bool m_pressed = false;
-    bool m_touching = false;
     bool m_shown = false; // signalShowComboxList(true) was sent last
-    int m_touchId = -1;
+    OneFinger m_finger{this};
 };

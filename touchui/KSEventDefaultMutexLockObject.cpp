@@ -32,10 +32,10 @@ KSEventDefaultMutexLockObject* KSEventDefaultMutexLockObject::createFactory(KSAp
 }
 
 KSEventDefaultMutexLockObject::KSEventDefaultMutexLockObject(KSAppEventFilter* filter, QObject* parent)
-    : KSLockObject(parent), m_timer(this), m_filter(filter)
+    : KSLockObject(parent), m_filter(filter)
 {
     m_timer.setSingleShot(true);
-    connect(&m_timer, &QTimer::timeout, this, &KSEventDefaultMutexLockObject::lockedTimeout);
+    connect(&m_timer, &TouchTimer::timeout, this, &KSEventDefaultMutexLockObject::lockedTimeout);
 }
 
 KSEventDefaultMutexLockObject::~KSEventDefaultMutexLockObject()

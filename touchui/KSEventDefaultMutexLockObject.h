@@ -1,13 +1,12 @@
 #pragma once
 
 #include "touchui/KSLockObject.h"
-
-#include <QTimer>
+#include "touchui/TouchTimer.h"
 
 class KSAppEventFilter;
 
 // The lock of last resort, which any object may take: one at a time. A watchdog breaks every lock of the
-// filter when its holder shows no sign of life for WATCHDOG_MSEC.
+// filter when its holder shows no sign of life for WATCHDOG_MSEC on the clock of the touch widgets.
 class KSEventDefaultMutexLockObject : public KSLockObject
 {
     Q_OBJECT
@@ -40,6 +39,6 @@ private:
     static KSEventDefaultMutexLockObject* s_instance;
     QObject* m_lockObj = nullptr;
     bool m_locked = false;
-    QTimer m_timer;
+    TouchTimer m_timer;
     KSAppEventFilter* m_filter;
 };

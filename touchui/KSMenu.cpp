@@ -49,6 +49,7 @@ KSMenu::KSMenu(QWidget* parent, const QFont& font)
     }
     setFont(textFont);
     connect(m_outsidePress, &OutsidePressFilter::pressedOutside, this, &QWidget::close);
+    connect(&m_finger, &OneFinger::cancelled, this, [this] { setCurrent(-1); });
 }
 
 KSMenu::~KSMenu()
@@ -103,7 +104,6 @@ void KSMenu::showEvent(QShowEvent* event)
 void KSMenu::hideEvent(QHideEvent* event)
 {
     m_outsidePress->stop();
-    m_touchId = -1;
     setCurrent(-1);
     if (m_autoCloseTimer != nullptr) {
         m_autoCloseTimer->stop();
@@ -242,11 +242,8 @@ bool KSMenu::event(QEvent* event)
     case QEvent::TouchBegin:
     case QEvent::TouchUpdate:
     case QEvent::TouchEnd:
-        return onTouchEvent(static_cast<QTouchEvent*>(event));
     case QEvent::TouchCancel:
-        m_touchId = -1;
-        setCurrent(-1);
-        return true;
+        return onTouchEvent(static_cast<QTouchEvent*>(event));
     case QEvent::MouseButtonPress:
     case QEvent::MouseButtonDblClick:
     case QEvent::MouseMove:
@@ -261,7 +258,7 @@ bool KSMenu::onMouseEvent(QEvent* event)
 {
     const auto* mouse = static_cast<QMouseEvent*>(event);
     const QPoint position = mouse->position().toPoint();
-    if (m_touchId != -1) {
+    if (m_finger.isDown()) {
         return true; // a finger has the menu
     }
     if (event->type() == QEvent::MouseMove) {
@@ -276,24 +273,17 @@ bool KSMenu::onMouseEvent(QEvent* event)
 
 bool KSMenu::onTouchEvent(QTouchEvent* event)
 {
-    if (!isEnabled() || event->points().isEmpty()) {
-        return true;
-    }
-    if (event->type() == QEvent::TouchBegin) {
-        m_touchId = event->points().constFirst().id();
-        onMouseButtonPress(event->points().constFirst().position().toPoint());
-        return true;
-    }
-    for (const QEventPoint& point : event->points()) {
-        if (point.id() != m_touchId) {
-            continue;
-        }
-        if (event->type() == QEvent::TouchEnd || point.state() == QEventPoint::State::Released) {
-            m_touchId = -1;
-            onMouseButtonRelease(point.position().toPoint(), Qt::LeftButton);
-        } else {
-            onMouseMove(point.position().toPoint());
-        }
+    switch (m_finger.follow(event)) {
+    case OneFinger::Step::Begin:
+        onMouseButtonPress(m_finger.positionIn(this).toPoint());
+        break;
+    case OneFinger::Step::Move:
+        onMouseMove(m_finger.positionIn(this).toPoint());
+        break;
+    case OneFinger::Step::End:
+        onMouseButtonRelease(m_finger.positionIn(this).toPoint(), Qt::LeftButton);
+        break;
+    case OneFinger::Step::None:
         break;
     }
     return true;
@@ -327,7 +317,7 @@ bool KSMenu::onKeyEvent(QKeyEvent* event)
 
 void KSMenu::onMouseLeave()
 {
-    if (m_touchId == -1) {
+    if (!m_finger.isDown()) {
         setCurrent(-1);
     }
 }

@@ -1,6 +1,7 @@
 #pragma once
 
 #include "touchui/MenuPlacement.h"
+#include "touchui/OneFinger.h"
 #include "touchui/SliceFrame.h"
 
 #include <QMenu>
@@ -91,5 +92,5 @@ private:
     int m_alignment = MenuPlacement::Below;
     int m_autoCloseTime = 0;
     int m_current = -1;
-    int m_touchId = -1;
+    OneFinger m_finger{this};
 };

@@ -30,6 +30,7 @@ void KSRadiobutton::init()
 {
     setAttribute(Qt::WA_AcceptTouchEvents);
     setFocusPolicy(Qt::NoFocus);
+    connect(&m_finger, &OneFinger::cancelled, this, &KSRadiobutton::comeUp);
     QFont textFont = font();
     textFont.setPixelSize(TEXT_PIXELS);
     setFont(textFont);
@@ -77,10 +78,8 @@ bool KSRadiobutton::event(QEvent* event)
     case QEvent::TouchBegin:
     case QEvent::TouchUpdate:
     case QEvent::TouchEnd:
-        return onTouchEvent(static_cast<QTouchEvent*>(event));
     case QEvent::TouchCancel:
-        cancelTouch();
-        return true;
+        return onTouchEvent(static_cast<QTouchEvent*>(event));
     default:
         return QRadioButton::event(event);
     }
@@ -88,25 +87,17 @@ bool KSRadiobutton::event(QEvent* event)
 
 bool KSRadiobutton::onTouchEvent(QTouchEvent* event)
 {
-    if (!isEnabled() || event->points().isEmpty()) {
-        return true;
-    }
-    if (event->type() == QEvent::TouchBegin) {
-        cancelTouch(); // an earlier touch whose end was lost
-        m_touchId = event->points().constFirst().id();
-        sendMouse(QEvent::MouseButtonPress, event->points().constFirst().position());
-        return true;
-    }
-    for (const QEventPoint& point : event->points()) {
-        if (point.id() != m_touchId) {
-            continue;
-        }
-        if (event->type() == QEvent::TouchEnd || point.state() == QEventPoint::State::Released) {
-            m_touchId = -1;
-            sendMouse(QEvent::MouseButtonRelease, point.position());
-        } else {
-            sendMouse(QEvent::MouseMove, point.position());
-        }
+    switch (m_finger.follow(event)) {
+    case OneFinger::Step::Begin:
+        sendMouse(QEvent::MouseButtonPress, m_finger.positionIn(this));
+        break;
+    case OneFinger::Step::Move:
+        sendMouse(QEvent::MouseMove, m_finger.positionIn(this));
+        break;
+    case OneFinger::Step::End:
+        sendMouse(QEvent::MouseButtonRelease, m_finger.positionIn(this));
+        break;
+    case OneFinger::Step::None:
         break;
     }
     return true;
@@ -128,22 +119,10 @@ void KSRadiobutton::sendMouse(QEvent::Type type, const QPointF& position)
 }
 
 // The button comes up and nothing is chosen.
-void KSRadiobutton::cancelTouch()
+void KSRadiobutton::comeUp()
 {
-    if (m_touchId == -1) {
-        return;
-    }
-    m_touchId = -1;
     sendMouse(QEvent::MouseMove, OUTSIDE);
     sendMouse(QEvent::MouseButtonRelease, OUTSIDE);
-}
-
-void KSRadiobutton::changeEvent(QEvent* event)
-{
-    if (event->type() == QEvent::EnabledChange && !isEnabled()) {
-        m_touchId = -1;
-    }
-    QRadioButton::changeEvent(event);
 }
 
 void KSRadiobutton::paintEvent(QPaintEvent*)

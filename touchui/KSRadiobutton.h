@@ -1,5 +1,7 @@
 #pragma once
 
+#include "touchui/OneFinger.h"
+
 #include <QEvent>
 #include <QPixmap>
 #include <QRadioButton>
@@ -27,15 +29,14 @@ protected:
     bool event(QEvent* event) override;
     void paintEvent(QPaintEvent* event) override;
     bool hitButton(const QPoint& position) const override;
-    void changeEvent(QEvent* event) override;
 
 private:
     void init();
     bool onTouchEvent(QTouchEvent* event);
     void sendMouse(QEvent::Type type, const QPointF& position);
-    void cancelTouch();
+    void comeUp();
     QSize pictureSize() const;
 
     std::array<std::array<QPixmap, 3>, 2> m_pictures; // off and on; rest, pressed, disabled
-    int m_touchId = -1;
+    OneFinger m_finger{this};
 };

@@ -29,6 +29,7 @@ KSSLider::KSSLider(const QString& images, Qt::Orientation orientation, QWidget* 
     setStyle(m_style);
     setAttribute(Qt::WA_AcceptTouchEvents);
     setFocusPolicy(Qt::NoFocus);
+    connect(&m_finger, &OneFinger::cancelled, this, &KSSLider::letGo);
     Initialization(images, orientation);
 }
 
@@ -80,6 +81,7 @@ void KSSLider::setReponse(bool response)
 {
     m_response = response;
     if (!m_response) {
+        m_finger.cancel();
         letGo();
     }
 }
@@ -123,10 +125,8 @@ bool KSSLider::event(QEvent* event)
     case QEvent::TouchBegin:
     case QEvent::TouchUpdate:
     case QEvent::TouchEnd:
-        return onTouchEvent(static_cast<QTouchEvent*>(event));
     case QEvent::TouchCancel:
-        letGo();
-        return true;
+        return onTouchEvent(static_cast<QTouchEvent*>(event));
     case QEvent::KeyPress:
     case QEvent::KeyRelease:
         return true;
@@ -137,42 +137,26 @@ bool KSSLider::event(QEvent* event)
 
 bool KSSLider::onTouchEvent(QTouchEvent* event)
 {
-    if (!isEnabled() || event->points().isEmpty()) {
-        return true;
-    }
-    if (event->type() == QEvent::TouchBegin) {
-        letGo(); // an earlier touch whose end was lost
-        m_touchId = event->points().constFirst().id();
-        sendMouse(QEvent::MouseButtonPress, event->points().constFirst());
-        return true;
-    }
-    const QEventPoint* point = findTouchPointByID(event->points());
-    if (point == nullptr) {
-        return true;
-    }
-    if (event->type() == QEvent::TouchEnd || point->state() == QEventPoint::State::Released) {
-        m_touchId = -1;
-        sendMouse(QEvent::MouseButtonRelease, *point);
-    } else {
-        sendMouse(QEvent::MouseMove, *point);
+    switch (m_finger.follow(event)) {
+    case OneFinger::Step::Begin:
+        sendMouse(QEvent::MouseButtonPress);
+        break;
+    case OneFinger::Step::Move:
+        sendMouse(QEvent::MouseMove);
+        break;
+    case OneFinger::Step::End:
+        sendMouse(QEvent::MouseButtonRelease);
+        break;
+    case OneFinger::Step::None:
+        break;
     }
     return true;
 }
 
-const QEventPoint* KSSLider::findTouchPointByID(const QList<QEventPoint>& points) const
-{
-    for (const QEventPoint& point : points) {
-        if (point.id() == m_touchId) {
-            return &point;
-        }
-    }
-    return nullptr;
-}
-
-void KSSLider::sendMouse(QEvent::Type type, const QEventPoint& point)
+void KSSLider::sendMouse(QEvent::Type type)
 {
     const Qt::MouseButtons held = type == QEvent::MouseButtonRelease ? Qt::NoButton : Qt::LeftButton;
-    QMouseEvent event(type, point.position().toPoint(), point.globalPosition().toPoint(),
+    QMouseEvent event(type, m_finger.positionIn(this).toPoint(), m_finger.position().toPoint(),
                       type == QEvent::MouseMove ? Qt::NoButton : Qt::LeftButton, held, Qt::NoModifier);
     if (type == QEvent::MouseButtonPress) {
         mousePressEvent(&event);
@@ -237,7 +221,6 @@ void KSSLider::mouseReleaseEvent(QMouseEvent* event)
 // Ends a press, wherever the handle is now.
 void KSSLider::letGo()
 {
-    m_touchId = -1;
     if (m_dragging) {
         m_dragging = false;
         setSliderDown(false);

@@ -1,13 +1,13 @@
 #pragma once
 
+#include "touchui/OneFinger.h"
+
 #include <QEvent>
-#include <QList>
 #include <QPoint>
 #include <QRect>
 #include <QSlider>
 
 class KSSliderStyle;
-class QEventPoint;
 class QTouchEvent;
 
 // A slider for one finger: touches become mouse events of the slider, its handle keeps its distance to the
@@ -66,13 +66,12 @@ protected:
 
 private:
     bool onTouchEvent(QTouchEvent* event);
-    const QEventPoint* findTouchPointByID(const QList<QEventPoint>& points) const;
-    void sendMouse(QEvent::Type type, const QEventPoint& point);
+    void sendMouse(QEvent::Type type);
     void letGo();
     int valueAt(const QPoint& position) const;
 
     KSSliderStyle* m_style; // child of this
-    int m_touchId = -1;
+    OneFinger m_finger{this};
     bool m_response = true;
     bool m_pressed = false;  // press and release signals come in pairs
     bool m_dragging = false; // the handle is held

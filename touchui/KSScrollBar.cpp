@@ -22,6 +22,7 @@ void KSScrollBar::init()
 {
     setAttribute(Qt::WA_AcceptTouchEvents);
     setFocusPolicy(Qt::NoFocus);
+    connect(&m_finger, &OneFinger::cancelled, this, &KSScrollBar::letGo);
 }
 
 bool KSScrollBar::event(QEvent* event)
@@ -31,7 +32,7 @@ bool KSScrollBar::event(QEvent* event)
     case QEvent::TouchUpdate:
     case QEvent::TouchEnd:
     case QEvent::TouchCancel:
-        return handleTouch(event);
+        return handleTouch(static_cast<QTouchEvent*>(event));
     case QEvent::ContextMenu:
         return true;
     default:
@@ -39,39 +40,45 @@ bool KSScrollBar::event(QEvent* event)
     }
 }
 
-bool KSScrollBar::handleTouch(QEvent* event)
+bool KSScrollBar::handleTouch(const QTouchEvent* event)
 {
-    const auto* touch = static_cast<QTouchEvent*>(event);
-    if (touch->points().isEmpty() || event->type() == QEvent::TouchCancel) {
-        if (m_pressed) {
-            QMouseEvent release(QEvent::MouseButtonRelease, QPointF(), mapToGlobal(QPointF()), Qt::LeftButton,
-                                Qt::NoButton, Qt::NoModifier);
-            mouseReleaseEvent(&release);
-        }
-        return true;
-    }
-    const QEventPoint& point = touch->points().constFirst();
-    const QPointF exact = point.position();
+    const OneFinger::Step step = m_finger.follow(event);
+    const QPointF exact = m_finger.positionIn(this);
     const QPoint cut(static_cast<int>(exact.x()), static_cast<int>(exact.y()));
-    const auto send = [&](QEvent::Type type, const QPoint& position) {
-        const bool held = type != QEvent::MouseButtonRelease;
-        QMouseEvent mouse(type, position, mapToGlobal(position),
-                          type == QEvent::MouseMove ? Qt::NoButton : Qt::LeftButton,
-                          held ? Qt::LeftButton : Qt::NoButton, Qt::NoModifier);
-        if (type == QEvent::MouseButtonPress)
-            mousePressEvent(&mouse);
-        else if (type == QEvent::MouseMove)
-            mouseMoveEvent(&mouse);
-        else
-            mouseReleaseEvent(&mouse);
-    };
-    if (event->type() == QEvent::TouchBegin)
-        send(QEvent::MouseButtonPress, cut);
-    else if (event->type() == QEvent::TouchUpdate)
-        send(QEvent::MouseMove, cut);
-    else
-        send(QEvent::MouseButtonRelease, exact.toPoint());
+    switch (step) {
+    case OneFinger::Step::Begin:
+        sendMouse(QEvent::MouseButtonPress, cut);
+        break;
+    case OneFinger::Step::Move:
+        sendMouse(QEvent::MouseMove, cut);
+        break;
+    case OneFinger::Step::End:
+        sendMouse(QEvent::MouseButtonRelease, exact.toPoint());
+        break;
+    case OneFinger::Step::None:
+        break;
+    }
     return true;
+}
+
+void KSScrollBar::sendMouse(QEvent::Type type, const QPoint& position)
+{
+    const bool held = type != QEvent::MouseButtonRelease;
+    QMouseEvent mouse(type, position, mapToGlobal(position),
+                      type == QEvent::MouseMove ? Qt::NoButton : Qt::LeftButton,
+                      held ? Qt::LeftButton : Qt::NoButton, Qt::NoModifier);
+    if (type == QEvent::MouseButtonPress)
+        mousePressEvent(&mouse);
+    else if (type == QEvent::MouseMove)
+        mouseMoveEvent(&mouse);
+    else
+        mouseReleaseEvent(&mouse);
+}
+
+void KSScrollBar::letGo()
+{
+    if (m_pressed)
+        sendMouse(QEvent::MouseButtonRelease, QPoint());
 }
 
 void KSScrollBar::mousePressEvent(QMouseEvent* event)

@@ -1,9 +1,13 @@
 #pragma once
 
+#include "touchui/OneFinger.h"
+
+#include <QEvent>
 #include <QPixmap>
 #include <QScrollBar>
 
 class QPainter;
+class QTouchEvent;
 
 // A scroll bar that paints itself from pictures and that a finger works like a mouse. GUI thread only.
 class KSScrollBar : public QScrollBar
@@ -39,8 +43,11 @@ private:
     void init();
     const Handle& handlePictures();
     const QPixmap& base();
-    bool handleTouch(QEvent* event);
+    bool handleTouch(const QTouchEvent* event);
+    void sendMouse(QEvent::Type type, const QPoint& position);
+    void letGo();
 
+    OneFinger m_finger{this};
     bool m_pressed = false;
     Handle m_handles[2]; // at rest and pressed; loaded at first use
     QPixmap m_base;

@@ -23,15 +23,6 @@ bool isTouch(const QEvent* event)
            event->type() == QEvent::TouchEnd || event->type() == QEvent::TouchCancel;
 }
 
-const QEventPoint* pointOf(const QTouchEvent* event, int id)
-{
-    for (const QEventPoint& point : event->points()) {
-        if (point.id() == id)
-            return &point;
-    }
-    return nullptr;
-}
-
 } // namespace
 
 bool KSScrollViewerWidget::eventFilter(QObject* object, QEvent* event)
@@ -92,34 +83,29 @@ bool KSScrollViewerWidget::handleTouchEventFilter(QObject* object, QEvent* event
     if (event->type() == QEvent::Gesture)
         return object == this || object == viewport();
     auto* touch = static_cast<QTouchEvent*>(event);
-    if (event->type() == QEvent::TouchCancel) {
-        cancelTouch();
+    if (event->type() != QEvent::TouchCancel && isOtherItemTouchWhenGraping(object, event))
         return true;
-    }
-    if (touch->points().isEmpty() || isOtherItemTouchWhenGraping(object, event))
-        return true;
+    if (m_finger.follow(touch, object) == OneFinger::Step::None)
+        return !m_isTake;
     auto* item = qobject_cast<KSBaseItemWidget*>(object);
     const bool isItem = item && (m_board->indexOf(item) >= 0 || m_drag->item() == item);
     if (!isItem && object != this && object != viewport()) {
         onTranslateTouchEventToMouse(object, touch);
         return true;
     }
-    if (isAutoFilck()) {
-        const bool result = onTouchEvent(object, touch);
-        const QPointF position = touch->points().constFirst().globalPosition();
-        handleFlickBeginEvent(object, mapFromGlobal(position.toPoint()));
-        return result;
-    }
+    const bool brake = isAutoFilck();
     const bool result = onTouchEvent(object, touch);
-    onTranslateTouchEventToMouse(object, touch);
+    if (brake)
+        handleFlickBeginEvent(m_finger.positionIn(this).toPoint());
+    else
+        onTranslateTouchEventToMouse(object, touch);
     return result;
 }
 
 // A finger on a list in flight stops it and presses nothing.
-void KSScrollViewerWidget::handleFlickBeginEvent(QObject* object, const QPoint& pos)
+void KSScrollViewerWidget::handleFlickBeginEvent(const QPoint& pos)
 {
     m_press.drop();
-    m_press.object = object;
     m_press.press = pos;
     m_press.last = pos;
     m_scrollValue = verticalScrollBar()->value();
@@ -129,65 +115,58 @@ void KSScrollViewerWidget::handleFlickBeginEvent(QObject* object, const QPoint& 
 
 bool KSScrollViewerWidget::isOtherItemTouchWhenGraping(QObject* object, QEvent* event) const
 {
-    if (!m_drag->isActive() || !isTouch(event))
+    if (!m_drag->isActive() || !isTouch(event) || object == m_finger.receiver())
         return false;
     if (object == this || object == viewport())
         return true;
     return m_board->indexOf(qobject_cast<KSBaseItemWidget*>(object)) >= 0;
 }
 
-// The window system took the touch away: nothing is tapped, and what is lifted drops where it is.
-void KSScrollViewerWidget::cancelTouch()
+// Nothing is tapped or held, nothing goes on moving, and what is lifted returns to its place.
+void KSScrollViewerWidget::rest()
 {
     m_flick.letGo();
     m_flick.rest();
     stopFlick();
     m_press.stopTimers();
-    m_press.object.clear();
     m_press.drop();
+    m_press.moved = false;
     m_press.willFlick = false;
     m_press.popupRequested = false;
-    handleDropItemWhenRelease();
+    putItemBack();
 }
 
 // For an item that has left the list: the finger that is on it gets no further, and others may come.
 void KSScrollViewerWidget::breakTouchOf(KSBaseItemWidget* item)
 {
-    if (m_press.object != item)
-        return;
-    m_press.object.clear();
-    m_flick.letGo();
-    stopFlick();
-    item->breakTouch();
+    if (m_finger.receiver() == item)
+        m_finger.cancel();
 }
 
 void KSScrollViewerWidget::hideEvent(QHideEvent* event)
 {
-    cancelTouch();
+    rest();
     QScrollArea::hideEvent(event);
 }
 
-bool KSScrollViewerWidget::onTouchEvent(QObject* object, QTouchEvent* event)
+bool KSScrollViewerWidget::onTouchEvent(QObject*, QTouchEvent*)
 {
-    const QEventPoint& first = event->points().constFirst();
-    const QPointF position = mapFromGlobal(first.globalPosition());
-    if (event->type() == QEvent::TouchBegin) {
+    const QPointF position = m_finger.positionIn(this);
+    if (m_finger.step() == OneFinger::Step::Begin) {
         if (m_isTake)
             return false;
         stopFlick();
         setFlickAbility(true);
-        m_flick.begin(first.id(), position);
+        m_flick.begin(position);
         setStartPoint(position);
         setEndPoint(position);
         return true;
     }
-    if (first.id() != m_flick.touchId())
+    if (!m_flick.isFollowing())
         return !m_isTake;
-    // The finger may be lifted while another stays, which is no end of the sequence.
-    if (event->type() == QEvent::TouchUpdate && first.state() != QEventPoint::State::Released) {
+    if (m_finger.step() == OneFinger::Step::Move) {
         m_flick.follow(position);
         setEndPoint(position);
-        m_press.object = object;
         return true;
     }
     m_flick.letGo();
@@ -295,32 +274,32 @@ std::optional<FlickMotion::DragBounds> KSScrollViewerWidget::dragBounds() const
 
 void KSScrollViewerWidget::onTranslateTouchEventToMouse(QObject* object, QTouchEvent* event)
 {
-    QPoint pos = mapFromGlobal(event->points().constFirst().globalPosition().toPoint());
-    switch (event->type()) {
-    case QEvent::TouchBegin:
+    QPoint pos = m_finger.positionIn(this).toPoint();
+    switch (m_finger.step()) {
+    case OneFinger::Step::Begin:
         onTranslateTouchBeginEventToMouse(object, event, pos);
         break;
-    case QEvent::TouchUpdate:
+    case OneFinger::Step::Move:
         onTranslateTouchUpdateEventToMouse(object, event, pos);
         break;
-    case QEvent::TouchEnd:
+    case OneFinger::Step::End:
         onTranslateTouchEndEventToMouse(object, event, pos);
         break;
-    default:
+    case OneFinger::Step::None:
         break;
     }
 }
 
-void KSScrollViewerWidget::onTranslateTouchBeginEventToMouse(QObject* object, QTouchEvent* event, QPoint& pos)
+void KSScrollViewerWidget::onTranslateTouchBeginEventToMouse(QObject*, QTouchEvent*, QPoint& pos)
 {
-    m_press.object = object;
-    beginPress(event->points().constFirst().id(), pos, Qt::LeftButton);
+    beginPress(ScrollViewerPress::Pointer::Finger, pos, Qt::LeftButton);
 }
 
-void KSScrollViewerWidget::beginPress(int touchId, const QPoint& pos, Qt::MouseButton button)
+void KSScrollViewerWidget::beginPress(ScrollViewerPress::Pointer pointer, const QPoint& pos,
+                                      Qt::MouseButton button)
 {
     m_scrollValue = verticalScrollBar()->value();
-    m_press.begin(touchId, pos, m_scrollValue);
+    m_press.begin(pointer, pos, m_scrollValue);
     m_press.item = m_board->itemAroundThePos(toBoard(pos), calculateVisibleRect());
     m_press.index = m_board->indexOf(m_press.item);
     if (pos.x() < m_effectiveLeft || pos.x() > m_effectiveLeft + m_effectiveWidth) {
@@ -400,21 +379,12 @@ void KSScrollViewerWidget::allTimersReset()
     m_drag->edgeTimer.restartIfActive();
 }
 
-void KSScrollViewerWidget::onTranslateTouchUpdateEventToMouse(QObject* object, QTouchEvent* event,
-                                                              QPoint& pos)
+void KSScrollViewerWidget::onTranslateTouchUpdateEventToMouse(QObject*, QTouchEvent*, QPoint& pos)
 {
     if (m_press.item)
         Q_EMIT widgetItemMouseMove(m_press.item, m_press.item->mapFromGlobal(mapToGlobal(pos)), this);
     if (!m_press.isActive())
         return;
-    const QEventPoint* point = pointOf(event, m_press.touchId);
-    if (!point)
-        return;
-    pos = mapFromGlobal(point->globalPosition().toPoint());
-    if (point->state() == QEventPoint::State::Released) {
-        onTranslateTouchEndEventToMouse(object, event, pos);
-        return;
-    }
     if (m_drag->isActive()) {
         moveDragItem(pos);
         return;
@@ -446,7 +416,6 @@ void KSScrollViewerWidget::JudgeHaveMoveNow(const QPoint& pos)
 void KSScrollViewerWidget::onTranslateTouchEndEventToMouse(QObject*, QTouchEvent*, QPoint& pos)
 {
     m_press.popup.stop();
-    m_press.object.clear();
     // A list that runs on has been moved, even when its first tick is still to come; a finger that slid a
     // little is a tap all the same.
     if ((m_press.willFlick || isMove()) && isAutoFilck() && m_bar->maximum() > m_bar->minimum())
@@ -498,15 +467,15 @@ void KSScrollViewerWidget::MouseReleaseChangeColorSingal(const QPoint& pos)
 void KSScrollViewerWidget::mousePressEvent(QMouseEvent* event)
 {
     stopFlick();
-    m_press.object.clear();
-    beginPress(ScrollViewerPress::MOUSE_TOUCH, event->position().toPoint(), event->button());
+    m_finger.cancel();
+    beginPress(ScrollViewerPress::Pointer::Mouse, event->position().toPoint(), event->button());
     event->accept();
 }
 
 void KSScrollViewerWidget::mouseMoveEvent(QMouseEvent* event)
 {
     event->accept();
-    if (m_press.object)
+    if (m_finger.isDown())
         return;
     const QPoint pos = event->position().toPoint();
     if (m_press.item)
@@ -536,7 +505,7 @@ void KSScrollViewerWidget::mouseReleaseEvent(QMouseEvent* event)
 {
     event->accept();
     m_press.popup.stop();
-    if (!m_press.object)
+    if (!m_finger.isDown())
         endPress(event->position().toPoint());
 }
 
@@ -644,6 +613,14 @@ void KSScrollViewerWidget::handleDropItemWhenRelease()
     dropItem();
     if (item && m_board->indexOf(item) >= 0 && item->geometry().bottom() > calculateVisibleRect().bottom())
         setLastVisibleItem(item);
+}
+
+void KSScrollViewerWidget::putItemBack()
+{
+    if (!m_drag->isActive())
+        return;
+    m_drag->returnToOrigin();
+    dropItem();
 }
 
 // The list changes under the finger: what was lifted is not put back.

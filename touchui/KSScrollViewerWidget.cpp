@@ -52,6 +52,7 @@ KSScrollViewerWidget::KSScrollViewerWidget(QWidget* parent)
 
     m_press.hold.setSingleShot(true);
     m_press.popup.setSingleShot(true);
+    connect(&m_finger, &OneFinger::cancelled, this, &KSScrollViewerWidget::rest);
     connect(&m_press.hold, &TouchTimer::timeout, this, &KSScrollViewerWidget::slotHandleMenuTimer);
     connect(&m_press.popup, &TouchTimer::timeout, this, &KSScrollViewerWidget::slotShowPopupItem);
     connect(&m_drag->edgeTimer, &TouchTimer::timeout, this, &KSScrollViewerWidget::slotHandleMoveTimer);
@@ -121,14 +122,14 @@ void KSScrollViewerWidget::setVScrollBarAlignment(Qt::Alignment alignment)
 
 void KSScrollViewerWidget::applyBarAlignment()
 {
-    if (m_barAlignment == Qt::AlignRight) {
-        m_bar->move(width() - BAR_WIDTH, 0);
-        m_board->board()->move(0, 0);
-    } else {
-        m_bar->move(0, 0);
-        m_board->board()->move(m_spacingToBar + BAR_WIDTH, 0);
-    }
+    m_board->board()->move(m_barAlignment == Qt::AlignRight ? 0 : m_spacingToBar + BAR_WIDTH, 0);
+    placeBar();
     m_bar->raise();
+}
+
+void KSScrollViewerWidget::placeBar()
+{
+    m_bar->move(m_barAlignment == Qt::AlignRight ? width() - BAR_WIDTH : 0, 0);
 }
 
 void KSScrollViewerWidget::setSpacingBetweenItems(int spacing)
@@ -567,8 +568,8 @@ void KSScrollViewerWidget::paintEvent(QPaintEvent* event)
 
 void KSScrollViewerWidget::scrollContentsBy(int dx, int dy)
 {
-    viewport()->scroll(dx, dy);
-    m_bar->move(m_bar->pos() - QPoint(dx, dy));
+    viewport()->scroll(dx, dy); // with all that lies on it, if it shows anything
+    placeBar();
     QScrollArea::scrollContentsBy(dx, dy);
 }
 

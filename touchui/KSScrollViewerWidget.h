@@ -1,6 +1,7 @@
 #pragma once
 
 #include "touchui/KSBaseItemWidget.h"
+#include "touchui/OneFinger.h"
 #include "touchui/ScrollViewerFlick.h"
 #include "touchui/ScrollViewerPress.h"
 #include "touchui/ScrollViewerRow.h"
@@ -209,6 +210,7 @@ private:
     void adjustLayout();
     void setScrollBarInfo(int maximum, int page);
     void applyBarAlignment();
+    void placeBar();
     void connectItem(KSBaseItemWidget* item);
     void disconnectItem(KSBaseItemWidget* item);
     void takeOut(int index, int count);
@@ -225,13 +227,13 @@ private:
     bool handleVScrollBarEvent(QEvent* event);
     void handleScrollBarPressedEvent(QEvent* event);
     bool handleTouchEventFilter(QObject* object, QEvent* event);
-    void handleFlickBeginEvent(QObject* object, const QPoint& pos);
+    void handleFlickBeginEvent(const QPoint& pos);
     bool isOtherItemTouchWhenGraping(QObject* object, QEvent* event) const;
-    void cancelTouch();
+    void rest();
     void breakTouchOf(KSBaseItemWidget* item);
 
     // Press
-    void beginPress(int touchId, const QPoint& pos, Qt::MouseButton button);
+    void beginPress(ScrollViewerPress::Pointer pointer, const QPoint& pos, Qt::MouseButton button);
     bool isItemDragAreaPressed() const;
     void handleItemPressedEvent(QMouseEvent* event);
     void handleAreaPressedEvent(QMouseEvent* event);
@@ -251,9 +253,11 @@ private:
     void updateIndicator();
     void dropItem();
     void handleDropItemWhenRelease();
+    void putItemBack();
     void abandonDrag();
 
     ScrollViewerBoard* m_board;
+    OneFinger m_finger{this};
     KSScrollBar* m_bar = nullptr;
     ScrollViewerFlick m_flick;
     ScrollViewerPress m_press;

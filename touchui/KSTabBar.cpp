@@ -24,6 +24,7 @@ KSTabBar::KSTabBar(QWidget* parent) : QTabBar(parent), m_style(new KSTabStyle)
     setStyle(m_style);
     setAttribute(Qt::WA_AcceptTouchEvents);
     setFocusPolicy(Qt::NoFocus);
+    connect(&m_finger, &OneFinger::cancelled, this, &KSTabBar::dropPress);
     setDrawBase(false);
     setExpanding(false);
     QFont textFont = font();
@@ -100,8 +101,7 @@ QSize KSTabBar::sizeHint() const
 void KSTabBar::tabInserted(int index)
 {
     m_sizes.insert(qBound(qsizetype(0), qsizetype(index), m_sizes.size()), QSize());
-    setPressedTab(-1);
-    m_pressStart = -1;
+    dropPress();
     QTabBar::tabInserted(index);
 }
 
@@ -110,8 +110,7 @@ void KSTabBar::tabRemoved(int index)
     if (index >= 0 && index < m_sizes.size()) {
         m_sizes.removeAt(index);
     }
-    setPressedTab(-1);
-    m_pressStart = -1;
+    dropPress();
     QTabBar::tabRemoved(index);
 }
 
@@ -121,12 +120,8 @@ bool KSTabBar::event(QEvent* event)
     case QEvent::TouchBegin:
     case QEvent::TouchUpdate:
     case QEvent::TouchEnd:
-        return onTouchEvent(static_cast<QTouchEvent*>(event));
     case QEvent::TouchCancel:
-        m_touchId = -1;
-        m_pressStart = -1;
-        setPressedTab(-1);
-        return true;
+        return onTouchEvent(static_cast<QTouchEvent*>(event));
     default:
         return QTabBar::event(event);
     }
@@ -134,24 +129,17 @@ bool KSTabBar::event(QEvent* event)
 
 bool KSTabBar::onTouchEvent(QTouchEvent* event)
 {
-    if (!isEnabled() || event->points().isEmpty()) {
-        return true;
-    }
-    if (event->type() == QEvent::TouchBegin) {
-        m_touchId = event->points().constFirst().id();
-        pressAt(event->points().constFirst().position().toPoint());
-        return true;
-    }
-    for (const QEventPoint& point : event->points()) {
-        if (point.id() != m_touchId) {
-            continue;
-        }
-        if (event->type() == QEvent::TouchEnd || point.state() == QEventPoint::State::Released) {
-            m_touchId = -1;
-            releaseAt(point.position().toPoint());
-        } else {
-            moveTo(point.position().toPoint());
-        }
+    switch (m_finger.follow(event)) {
+    case OneFinger::Step::Begin:
+        pressAt(m_finger.positionIn(this).toPoint());
+        break;
+    case OneFinger::Step::Move:
+        moveTo(m_finger.positionIn(this).toPoint());
+        break;
+    case OneFinger::Step::End:
+        releaseAt(m_finger.positionIn(this).toPoint());
+        break;
+    case OneFinger::Step::None:
         break;
     }
     return true;
@@ -159,31 +147,35 @@ bool KSTabBar::onTouchEvent(QTouchEvent* event)
 
 void KSTabBar::mousePressEvent(QMouseEvent* event)
 {
-    if (event->button() == Qt::LeftButton && m_touchId == -1) {
+    if (event->button() == Qt::LeftButton && !m_finger.isDown()) {
         pressAt(event->position().toPoint());
     }
 }
 
 void KSTabBar::mouseMoveEvent(QMouseEvent* event)
 {
-    if (m_touchId == -1) {
+    if (!m_finger.isDown()) {
         moveTo(event->position().toPoint());
     }
 }
 
 void KSTabBar::mouseReleaseEvent(QMouseEvent* event)
 {
-    if (event->button() == Qt::LeftButton && m_touchId == -1) {
+    if (event->button() == Qt::LeftButton && !m_finger.isDown()) {
         releaseAt(event->position().toPoint());
     }
 }
 
 void KSTabBar::hideEvent(QHideEvent* event)
 {
-    m_touchId = -1;
+    dropPress();
+    QTabBar::hideEvent(event);
+}
+
+void KSTabBar::dropPress()
+{
     m_pressStart = -1;
     setPressedTab(-1);
-    QTabBar::hideEvent(event);
 }
 
 void KSTabBar::pressAt(const QPoint& position)

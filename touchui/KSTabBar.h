@@ -1,5 +1,7 @@
 #pragma once
 
+#include "touchui/OneFinger.h"
+
 #include <QList>
 #include <QSize>
 #include <QTabBar>
@@ -44,6 +46,7 @@ private:
     void moveTo(const QPoint& position);
     void releaseAt(const QPoint& position);
     void setPressedTab(int index);
+    void dropPress();
     QSize textSize(int index) const;
     bool isUpright() const;
 
@@ -51,5 +54,5 @@ private:
     QList<QSize> m_sizes;  // of each tab; invalid: that of its text
     int m_pressStart = -1; // the tab that the press began on
     int m_pressedTab = -1; // the same while the finger is on it
-    int m_touchId = -1;
+    OneFinger m_finger{this};
 };

@@ -4,7 +4,6 @@
 #include "touchui/KSVIEW.h"
 #include "touchui/KSViewStyle.h"
 
-#include <QEventPoint>
 #include <QMouseEvent>
 #include <QPaintEvent>
 #include <QPainter>
@@ -41,6 +40,10 @@ KSTreeHeaderView::KSTreeHeaderView(KSTreeView* view) : QHeaderView(Qt::Horizonta
     setSortIndicatorShown(true);
     setSortIndicator(-1, Qt::AscendingOrder);
     setFocusPolicy(Qt::NoFocus);
+    // Far outside: the section comes up unclicked.
+    connect(&m_finger, &OneFinger::cancelled, this, [this] {
+        sendMouse(QEvent::MouseButtonRelease, viewport()->mapToGlobal(QPointF(-10000, -10000)));
+    });
 }
 
 QSize KSTreeHeaderView::sizeHint() const
@@ -68,30 +71,18 @@ bool KSTreeHeaderView::viewportEvent(QEvent* event)
 bool KSTreeHeaderView::onTouchEvent(QTouchEvent* event)
 {
     event->accept();
-    if (event->type() == QEvent::TouchCancel) {
-        if (m_touchId != -1) {
-            m_touchId = -1;
-            // Far outside: the section comes up unclicked.
-            sendMouse(QEvent::MouseButtonRelease, viewport()->mapToGlobal(QPointF(-10000, -10000)));
-        }
-        return true;
-    }
-    if (event->type() == QEvent::TouchBegin && m_touchId == -1 && !event->points().isEmpty()) {
-        const QEventPoint& point = event->points().constFirst();
-        m_touchId = point.id();
-        sendMouse(QEvent::MouseButtonPress, point.globalPosition());
-        return true;
-    }
-    for (const QEventPoint& point : event->points()) {
-        if (point.id() != m_touchId) {
-            continue;
-        }
-        if (point.state() == QEventPoint::State::Released || event->type() == QEvent::TouchEnd) {
-            m_touchId = -1;
-            sendMouse(QEvent::MouseButtonRelease, point.globalPosition());
-            return true;
-        }
-        sendMouse(QEvent::MouseMove, point.globalPosition());
+    switch (m_finger.follow(event)) {
+    case OneFinger::Step::Begin:
+        sendMouse(QEvent::MouseButtonPress, m_finger.position());
+        break;
+    case OneFinger::Step::Move:
+        sendMouse(QEvent::MouseMove, m_finger.position());
+        break;
+    case OneFinger::Step::End:
+        sendMouse(QEvent::MouseButtonRelease, m_finger.position());
+        break;
+    case OneFinger::Step::None:
+        break;
     }
     return true;
 }

@@ -1,5 +1,7 @@
 #pragma once
 
+#include "touchui/OneFinger.h"
+
 #include <QEvent>
 #include <QHeaderView>
 
@@ -26,5 +28,5 @@ private:
     void sendMouse(QEvent::Type type, const QPointF& globalPosition);
 
     KSTreeView* m_view;
-    int m_touchId = -1;
+    OneFinger m_finger{this};
 };

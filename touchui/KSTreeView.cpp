@@ -12,7 +12,6 @@
 namespace
 {
 
-constexpr int HOLD_INTERVAL = 700;
 constexpr int LOADING_INTERVAL = 100;
 constexpr int TOOLTIP_TIME = 3000;
 
@@ -45,9 +44,8 @@ KSTreeView::KSTreeView(QWidget* parent)
     setVerticalScrollMode(QAbstractItemView::ScrollPerPixel);
     setExpandsOnDoubleClick(false);
     setTextElideMode(Qt::ElideRight);
-    m_holdTimer.setSingleShot(true);
-    m_holdTimer.setInterval(HOLD_INTERVAL);
-    connect(&m_holdTimer, &QTimer::timeout, this, &KSTreeView::slotHold);
+    connect(&m_finger, &OneFinger::held, this, &KSTreeView::slotHold);
+    connect(&m_finger, &OneFinger::cancelled, this, &KSTreeView::rest);
     m_singleShotTimer.setSingleShot(true);
     m_singleShotTimer.setInterval(TOOLTIP_TIME);
     connect(&m_singleShotTimer, &QTimer::timeout, this, &KSTreeView::hideElidedText);
@@ -59,6 +57,7 @@ KSTreeView::KSTreeView(QWidget* parent)
 
 KSTreeView::~KSTreeView()
 {
+    KSTreeView::stopFlick();
     setStyle(nullptr); // ours goes before the widget does
 }
 

@@ -3,6 +3,7 @@
 #include "touchui/FlickMotion.h"
 #include "touchui/KSVIEW.h"
 #include "touchui/KSViewStyle.h"
+#include "touchui/OneFinger.h"
 
 #include <QEvent>
 #include <QMap>
@@ -119,7 +120,7 @@ public:
     void clearRecording();
     // Starts the timers that run once more from the beginning.
     void allTimersReset();
-    void setHoldInterval(int milliseconds) { m_holdTimer.setInterval(milliseconds); }
+    void setHoldInterval(int milliseconds) { m_holdInterval = milliseconds; }
 
     using QTreeView::edit;
     void keyboardSearch(const QString&) override {} // would change the selection
@@ -162,12 +163,15 @@ private Q_SLOTS:
 
 private:
     enum PressState { NotPressed, Pressed, Held };
+    static constexpr int HOLD_INTERVAL = 700; // ms
 
     void initScrollBars();
     void beginMotion(const QPoint& point);
     void moveMotion(const QPoint& point);
     void endMotion(const QPoint& point);
     void cancelPress();
+    void rest();
+    QPoint fingerPosition() const;
     void beginPress(const QPoint& point);
     void tap(const QPoint& point);
     void makeCurrent(const QModelIndex& index);
@@ -192,7 +196,7 @@ private:
     bool m_autoFlick = false;
     bool m_hasFlicked = false;
     bool m_pendingStart = false; // the first movement sets the start point anew
-    int m_touchId = -1;
+    OneFinger m_finger{this};
     bool m_sendingMouse = false; // a touch is being passed on as a mouse event
 
     PressState m_pressState = NotPressed;
@@ -205,7 +209,7 @@ private:
     bool m_checkBoxVisible = true;
     bool m_elidedTextShown = false;
 
-    QTimer m_holdTimer;
+    int m_holdInterval = HOLD_INTERVAL;
     QTimer m_singleShotTimer; // takes the balloon of a shortened name away
     QTimer m_loadingTimer;
 };

@@ -2,9 +2,9 @@
 #include "touchui/KSScrollBar.h"
 #include "touchui/KSTreeModel.h"
 #include "touchui/KSTreeView.h"
+#include "touchui/TouchClock.h"
 
 #include <QApplication>
-#include <QEventPoint>
 #include <QMouseEvent>
 #include <QTimerEvent>
 #include <QTouchEvent>
@@ -46,29 +46,27 @@ bool KSTreeView::viewportEvent(QEvent* event)
 bool KSTreeView::onTouchEvent(QTouchEvent* event)
 {
     event->accept();
-    switch (event->type()) {
-    case QEvent::TouchBegin:
+    switch (m_finger.follow(event)) {
+    case OneFinger::Step::Begin:
         return onTouchBeginEvent(event);
-    case QEvent::TouchUpdate:
+    case OneFinger::Step::Move:
         return onTouchUpdateEvent(event);
-    case QEvent::TouchEnd:
+    case OneFinger::Step::End:
         return onTouchEndEvent(event);
-    default: // cancelled: nothing was tapped, and nothing goes on moving
-        m_touchId = -1;
-        stopFlick();
-        cancelPress();
+    case OneFinger::Step::None:
         return true;
     }
+    return true;
 }
 
-bool KSTreeView::onTouchBeginEvent(QTouchEvent* event)
+QPoint KSTreeView::fingerPosition() const
 {
-    if (m_touchId != -1 || event->points().isEmpty()) {
-        return true;
-    }
-    const QEventPoint& touch = event->points().constFirst();
-    m_touchId = touch.id();
-    const QPoint point = viewport()->mapFromGlobal(touch.globalPosition()).toPoint();
+    return m_finger.positionIn(viewport()).toPoint();
+}
+
+bool KSTreeView::onTouchBeginEvent(QTouchEvent*)
+{
+    const QPoint point = fingerPosition();
     const bool brake = isAutoFilck();
     beginMotion(point);
     if (!brake) {
@@ -77,45 +75,32 @@ bool KSTreeView::onTouchBeginEvent(QTouchEvent* event)
     return true;
 }
 
-bool KSTreeView::onTouchUpdateEvent(QTouchEvent* event)
+bool KSTreeView::onTouchUpdateEvent(QTouchEvent*)
 {
-    for (const QEventPoint& touch : event->points()) {
-        if (touch.id() != m_touchId) {
-            continue;
-        }
-        if (touch.state() == QEventPoint::State::Released) {
-            return onTouchEndEvent(event);
-        }
-        const QPoint point = viewport()->mapFromGlobal(touch.globalPosition()).toPoint();
-        moveMotion(point);
-        sendMouse(QEvent::MouseMove, point);
-        return true;
-    }
+    const QPoint point = fingerPosition();
+    moveMotion(point);
+    sendMouse(QEvent::MouseMove, point);
     return true;
 }
 
 bool KSTreeView::onTouchEndEvent(QTouchEvent* event)
 {
-    for (const QEventPoint& touch : event->points()) {
-        if (touch.id() == m_touchId) {
-            endMotion(viewport()->mapFromGlobal(touch.globalPosition()).toPoint());
-            onTranslateTouchEndEventToMouse(event);
-            m_touchId = -1;
-            return true;
-        }
-    }
+    endMotion(fingerPosition());
+    onTranslateTouchEndEventToMouse(event);
     return true;
 }
 
-void KSTreeView::onTranslateTouchEndEventToMouse(QTouchEvent* event)
+void KSTreeView::onTranslateTouchEndEventToMouse(QTouchEvent*)
 {
-    for (const QEventPoint& touch : event->points()) {
-        if (touch.id() == m_touchId) {
-            sendMouse(QEvent::MouseButtonRelease,
-                      viewport()->mapFromGlobal(touch.globalPosition()).toPoint());
-            return;
-        }
-    }
+    sendMouse(QEvent::MouseButtonRelease, fingerPosition());
+}
+
+// Nothing was tapped, and nothing goes on moving.
+void KSTreeView::rest()
+{
+    stopFlick();
+    cancelPress();
+    hideElidedText();
 }
 
 void KSTreeView::sendMouse(QEvent::Type type, const QPoint& point)
@@ -141,7 +126,7 @@ void KSTreeView::mousePressEvent(QMouseEvent* event)
 {
     event->accept();
     const QPoint point = event->position().toPoint();
-    if (event->button() != Qt::LeftButton || (!m_sendingMouse && m_touchId != -1)) {
+    if (event->button() != Qt::LeftButton || (!m_sendingMouse && m_finger.isDown())) {
         return;
     }
     if (!m_sendingMouse) {
@@ -158,14 +143,14 @@ void KSTreeView::mouseMoveEvent(QMouseEvent* event)
 {
     event->accept();
     const QPoint point = event->position().toPoint();
-    if (!m_sendingMouse && (event->buttons() & Qt::LeftButton) && m_touchId == -1) {
+    if (!m_sendingMouse && (event->buttons() & Qt::LeftButton) && !m_finger.isDown()) {
         moveMotion(point);
     }
     if (m_pressState == NotPressed) {
         return;
     }
     if ((point - m_pressPoint).manhattanLength() > QApplication::startDragDistance()) {
-        m_holdTimer.stop();
+        m_finger.stopHold();
         m_moved = true;
     }
     if (m_pressedCheckBox.isValid() && !getCheckBoxRectForTouch(m_pressedCheckBox).contains(point)) {
@@ -182,7 +167,7 @@ void KSTreeView::mouseReleaseEvent(QMouseEvent* event)
 {
     event->accept();
     const QPoint point = event->position().toPoint();
-    if (event->button() != Qt::LeftButton || (!m_sendingMouse && m_touchId != -1)) {
+    if (event->button() != Qt::LeftButton || (!m_sendingMouse && m_finger.isDown())) {
         return;
     }
     if (!m_sendingMouse) {
@@ -217,14 +202,14 @@ void KSTreeView::beginPress(const QPoint& point)
     } else if (indicatorRectForTouch(first).contains(point)) {
         m_pressedIndicator = first;
     } else {
-        m_holdTimer.start();
+        m_finger.startHold(m_holdInterval);
     }
     viewport()->update();
 }
 
 void KSTreeView::cancelPress()
 {
-    m_holdTimer.stop();
+    m_finger.stopHold();
     m_pressState = NotPressed;
     m_moved = false;
     m_pressIndex = QModelIndex();
@@ -342,9 +327,9 @@ void KSTreeView::setEndPoint(const QPoint& point)
     m_scrollingFlag = 1;
     setVerticalScrollMode(QAbstractItemView::ScrollPerPixel);
     m_startScrollValue = verticalScrollBar()->value();
-    m_flickTimerId = startTimer(m_rules.interval);
+    m_flickTimerId = TouchClock::instance().start(this, m_rules.interval);
     m_hasFlicked = true;
-    m_holdTimer.stop();
+    m_finger.stopHold();
     hideElidedText();
 }
 
@@ -356,7 +341,7 @@ bool KSTreeView::isFlickEnd()
 void KSTreeView::stopFlick()
 {
     if (m_flickTimerId != 0) {
-        killTimer(m_flickTimerId);
+        TouchClock::instance().stop(this, m_flickTimerId);
         m_flickTimerId = 0;
     }
     m_autoFlick = false;
@@ -378,7 +363,7 @@ void KSTreeView::timerEvent(QTimerEvent* event)
     } else if (isAutoFilck()) {
         stopFlick();
     } else {
-        m_holdTimer.stop(); // the finger rests on a list that it has moved
+        m_finger.stopHold(); // the finger rests on a list that it has moved
     }
     // A glide dies at either end; there is no way on that would use up what is left of it.
     if (isAutoFilck() && FlickMotion::isAtLimit(bar->value(), bar->minimum(), bar->maximum())) {
@@ -418,16 +403,14 @@ void KSTreeView::changeScrollBarValue(int offset)
 
 void KSTreeView::hideEvent(QHideEvent* event)
 {
-    m_touchId = -1;
-    stopFlick();
-    cancelPress();
-    hideElidedText();
+    rest();
     QTreeView::hideEvent(event);
 }
 
 void KSTreeView::allTimersReset()
 {
-    for (QTimer* timer : {&m_holdTimer, &m_singleShotTimer, &m_loadingTimer}) {
+    m_finger.restartHold();
+    for (QTimer* timer : {&m_singleShotTimer, &m_loadingTimer}) {
         if (timer->isActive()) {
             timer->start();
         }

@@ -9,15 +9,25 @@
 
 OutsidePressFilter::OutsidePressFilter(QWidget* window, QObject* parent) : QObject(parent), m_window(window)
 {
+    registerWithGate();
+}
+
+void OutsidePressFilter::registerWithGate()
+{
+    if (m_gate != nullptr) {
+        return;
+    }
+    m_gate = KSAppEventFilter::current();
+    if (m_gate != nullptr) {
+        m_gate->registerEventFilter(this);
+    }
 }
 
 void OutsidePressFilter::start()
 {
     m_watching = true;
-    m_gate = KSAppEventFilter::current();
-    if (m_gate != nullptr) {
-        m_gate->registerPopupFilter(this);
-    } else {
+    registerWithGate();
+    if (m_gate == nullptr) {
         QCoreApplication::instance()->installEventFilter(this);
     }
 }
@@ -28,11 +38,7 @@ void OutsidePressFilter::stop()
     if (m_swallowsTouch || m_swallowsMouse) {
         return;
     }
-    if (m_gate != nullptr) {
-        m_gate->unegisterEventFilter(this);
-    } else {
-        QCoreApplication::instance()->removeEventFilter(this);
-    }
+    QCoreApplication::instance()->removeEventFilter(this); // where it stands when there is no gate
 }
 
 bool OutsidePressFilter::eventFilter(QObject* obj, QEvent* event)

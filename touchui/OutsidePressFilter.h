@@ -18,7 +18,8 @@ class OutsidePressFilter : public QObject
 {
     Q_OBJECT
 public:
-    // window is not owned and may go first. GUI thread only.
+    // window is not owned and may go first. Registers with the application's gate, so that it is asked before
+    // those that are made later. GUI thread only.
     explicit OutsidePressFilter(QWidget* window, QObject* parent = nullptr);
 
     // Between these the presses are watched. A press that is being swallowed is swallowed to its end.
@@ -32,6 +33,7 @@ Q_SIGNALS:
     void pressedOutside();
 
 private:
+    void registerWithGate();
     bool isOutside(QEvent* event) const;
     bool swallowPress(QObject* obj, QEvent* event);
     void endSwallowing();

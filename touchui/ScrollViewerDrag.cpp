@@ -43,7 +43,8 @@ void ScrollViewerDrag::lift(KSBaseItemWidget* item, DragFlagAlignment listAlignm
 {
     m_item = item;
     m_item->setPopup(true);
-    m_dropIndex = m_board.indexOf(item);
+    m_origin = m_board.indexOf(item);
+    m_dropIndex = m_origin;
     m_board.take(item);
     item->hide();
     keepLast(nullptr);

@@ -44,6 +44,8 @@ public:
     int getDropIndicatorID(const QRect& visible, bool tall) const;
     // Puts the item back into the list at the kept place and returns it; null when it is gone.
     KSBaseItemWidget* drop();
+    // Moves the kept place to where the item was lifted.
+    void returnToOrigin() { m_dropIndex = m_origin; }
     // Nothing is put back.
     void abandon();
     // The clone of the last drop, which the next drag deletes.
@@ -63,6 +65,7 @@ private:
     QPointer<KSBaseItemWidget> m_moving; // m_item itself when it has no clone
     QPointer<KSBaseItemWidget> m_lastClone;
     QSize m_size;
+    int m_origin = -1;
     int m_dropIndex = -1;
     bool m_active = false;
 };

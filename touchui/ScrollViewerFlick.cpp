@@ -16,9 +16,9 @@ ScrollViewerFlick::~ScrollViewerFlick()
     stopTimer();
 }
 
-void ScrollViewerFlick::begin(int touchId, const QPointF& position)
+void ScrollViewerFlick::begin(const QPointF& position)
 {
-    m_touchId = touchId;
+    m_following = true;
     m_first = position;
     m_current = position;
     m_pendingStart = true;

@@ -7,8 +7,8 @@
 
 #include <optional>
 
-// How a scroll viewer follows a finger and runs on after it: the two points of the motion, the finger that is
-// followed, and the timer, which reports at the owner. Points are in the viewer's coordinates.
+// How a scroll viewer follows a finger and runs on after it: the two points of the motion and the timer,
+// which reports at the owner. Points are in the viewer's coordinates.
 class ScrollViewerFlick
 {
 public:
@@ -17,12 +17,11 @@ public:
     ScrollViewerFlick(const ScrollViewerFlick&) = delete;
     ScrollViewerFlick& operator=(const ScrollViewerFlick&) = delete;
 
-    // The finger: -1 when none is followed.
-    int touchId() const { return m_touchId; }
-    void begin(int touchId, const QPointF& position);
+    bool isFollowing() const { return m_following; }
+    void begin(const QPointF& position);
     // The first update of a finger sets the start point once more.
     void follow(const QPointF& position);
-    void letGo() { m_touchId = -1; }
+    void letGo() { m_following = false; }
     bool isMove() const { return FlickMotion::isMove(m_first, m_current); }
 
     void setStart(const QPointF& point);
@@ -50,11 +49,11 @@ public:
 private:
     QObject* m_owner;
     int m_timerId = 0;
-    int m_touchId = -1;
     QPointF m_start;
     QPointF m_end;
     QPointF m_first;
     QPointF m_current;
+    bool m_following = false; // a finger
     bool m_pendingStart = false;
     bool m_auto = false;
     bool m_able = true;

@@ -2,11 +2,11 @@
 
 #include "touchui/FlickMotion.h"
 
-void ScrollViewerPress::begin(int id, const QPoint& position, int value)
+void ScrollViewerPress::begin(Pointer by, const QPoint& position, int value)
 {
     hold.stop();
     popup.stop();
-    touchId = id;
+    pointer = by;
     press = position;
     last = position;
     valueAtPress = value;
@@ -30,7 +30,7 @@ void ScrollViewerPress::stopTimers()
 
 bool ScrollViewerPress::isBeyondSlop(const QPoint& position) const
 {
-    const int slop = touchId == MOUSE_TOUCH ? FlickMotion::MOUSE_SLOP : FlickMotion::TOUCH_SLOP;
+    const int slop = pointer == Pointer::Mouse ? FlickMotion::MOUSE_SLOP : FlickMotion::TOUCH_SLOP;
     return FlickMotion::isBeyondSlop(press, position, slop);
 }
 

@@ -3,7 +3,6 @@
 #include "touchui/KSBaseItemWidget.h"
 #include "touchui/TouchTimer.h"
 
-#include <QObject>
 #include <QPoint>
 #include <QPointer>
 
@@ -12,16 +11,16 @@
 class ScrollViewerPress
 {
 public:
-    static constexpr int HOLD_TIME = 700;  // ms
-    static constexpr int POPUP_TIME = 50;  // ms on a drag handle until the item is lifted
-    static constexpr int NO_TOUCH = -1;    // nothing is pressed
-    static constexpr int MOUSE_TOUCH = -2; // the mouse is
+    static constexpr int HOLD_TIME = 700; // ms
+    static constexpr int POPUP_TIME = 50; // ms on a drag handle until the item is lifted
+    // Who presses.
+    enum class Pointer { None, Finger, Mouse };
 
-    // A press by the touch point (or MOUSE_TOUCH). value is the scroll bar's.
-    void begin(int touchId, const QPoint& position, int value);
+    // value is the scroll bar's.
+    void begin(Pointer by, const QPoint& position, int value);
     // The press does not count any more: its end does nothing.
-    void drop() { touchId = NO_TOUCH; }
-    bool isActive() const { return touchId != NO_TOUCH; }
+    void drop() { pointer = Pointer::None; }
+    bool isActive() const { return pointer != Pointer::None; }
     void clearItem();
     void stopTimers();
 
@@ -31,8 +30,7 @@ public:
     void calculateBounds(int itemHeight, int viewerHeight);
     bool isOutside(int y) const { return y < upperBound || y > lowerBound; }
 
-    int touchId = NO_TOUCH;
-    QPointer<QObject> object; // under the finger; the mouse stays out while there is one
+    Pointer pointer = Pointer::None;
     QPointer<KSBaseItemWidget> item;
     int index = -1;
     QPoint positionInItem = QPoint(-1, -1); // in item coordinates

@@ -2,10 +2,9 @@
 
 #include "support/LogManager.h"
 
-#include <QCoreApplication>
 #include <QEventPoint>
 #include <QMouseEvent>
-#include <QPointingDevice>
+#include <QScopedValueRollback>
 #include <QTouchEvent>
 
 TouchEventButton::TouchEventButton(QWidget* parent) : QPushButton(parent)
@@ -25,6 +24,7 @@ void TouchEventButton::init()
     // up.
     setFocusPolicy(Qt::NoFocus);
     connect(this, &QAbstractButton::released, this, &TouchEventButton::slotEmitReleased);
+    connect(&m_finger, &OneFinger::cancelled, this, &TouchEventButton::comeUp);
 }
 
 bool TouchEventButton::event(QEvent* event)
@@ -46,20 +46,10 @@ bool TouchEventButton::event(QEvent* event)
         }
         return true;
     case QEvent::TouchCancel:
-        touchCancelEvent();
+        m_finger.follow(static_cast<QTouchEvent*>(event));
         return true;
     default:
         return QPushButton::event(event);
-    }
-}
-
-// The end of a touch never comes to a button that was disabled under it, and must not be waited for.
-void TouchEventButton::changeEvent(QEvent* event)
-{
-    QPushButton::changeEvent(event);
-    if (event->type() == QEvent::EnabledChange && !isEnabled()) {
-        m_touching = false;
-        m_touchId = -1;
     }
 }
 
@@ -68,72 +58,53 @@ bool TouchEventButton::touchBeginEvent(QTouchEvent* event)
     if (event->points().isEmpty()) {
         return true;
     }
-    const QEventPoint& point = event->points().constFirst();
-    const QPointF start = point.globalPressPosition();
+    const QPointF start = event->points().constFirst().globalPressPosition();
     Q_EMIT signalPressedPoint(QPoint(static_cast<int>(start.x()), static_cast<int>(start.y())));
-    if (m_touching) {
+    if (m_finger.follow(event, this) != OneFinger::Step::Begin) {
         return true;
     }
     ++m_pressCount;
-    m_touching = true;
-    m_touchId = point.id();
-    m_lastPosition = point.position().toPoint();
-    QMouseEvent press(QEvent::MouseButtonPress, m_lastPosition, point.globalPosition().toPoint(),
-                      Qt::LeftButton, Qt::LeftButton, Qt::NoModifier);
+    m_lastPosition = m_finger.positionIn(this).toPoint();
+    QMouseEvent press(QEvent::MouseButtonPress, m_lastPosition, m_finger.position().toPoint(), Qt::LeftButton,
+                      Qt::LeftButton, Qt::NoModifier);
     mousePressEvent(&press);
     return true;
 }
 
 bool TouchEventButton::touchUpdateEvent(QTouchEvent* event)
 {
-    if (!m_touching) {
-        return true;
-    }
-    for (const QEventPoint& point : event->points()) {
-        if (point.id() != m_touchId) {
-            continue;
-        }
-        if (point.state() == QEventPoint::State::Released) {
-            m_touching = false;
-            m_touchId = -1;
-            sendRelease(m_lastPosition, mapToGlobal(m_lastPosition));
-            return true;
-        }
-        QPoint position = point.position().toPoint();
-        QPoint screenPosition = point.globalPosition().toPoint();
-        moveIntoWidget(position, screenPosition);
-        m_lastPosition = position;
-        QMouseEvent move(QEvent::MouseMove, position, screenPosition, Qt::LeftButton, Qt::LeftButton,
-                         Qt::NoModifier);
-        mouseMoveEvent(&move);
-    }
+    followMotion(event);
     return true;
 }
 
 bool TouchEventButton::touchEndEvent(QTouchEvent* event)
 {
-    if (!m_touching || event->points().isEmpty()) {
-        return true;
-    }
-    m_touching = false;
-    m_touchId = -1;
-    const QEventPoint& point = event->points().constFirst();
-    QPoint position = point.position().toPoint();
-    QPoint screenPosition = point.globalPosition().toPoint();
-    moveIntoWidget(position, screenPosition);
-    sendRelease(position, screenPosition);
+    followMotion(event);
     return true;
 }
 
-// The window system took the touch away (for a gesture of its own, say): the button comes up and nothing is
-// clicked.
-void TouchEventButton::touchCancelEvent()
+void TouchEventButton::followMotion(const QTouchEvent* event)
 {
-    if (!m_touching) {
-        return;
+    const OneFinger::Step step = m_finger.follow(event, this);
+    QPoint position = m_finger.positionIn(this).toPoint();
+    QPoint screenPosition = m_finger.position().toPoint();
+    moveIntoWidget(position, screenPosition);
+    if (step == OneFinger::Step::Move) {
+        m_lastPosition = position;
+        QMouseEvent move(QEvent::MouseMove, position, screenPosition, Qt::LeftButton, Qt::LeftButton,
+                         Qt::NoModifier);
+        mouseMoveEvent(&move);
+    } else if (step == OneFinger::Step::End && event->type() == QEvent::TouchUpdate) {
+        sendRelease(m_lastPosition, mapToGlobal(m_lastPosition)); // another finger stays
+    } else if (step == OneFinger::Step::End) {
+        sendRelease(position, screenPosition);
     }
-    m_touching = false;
-    m_touchId = -1;
+}
+
+// The button comes up and nothing is clicked.
+void TouchEventButton::comeUp()
+{
+    const QScopedValueRollback<bool> guard(m_touchCancelled, true);
     const QPoint outside(-1, -1);
     QMouseEvent move(QEvent::MouseMove, outside, mapToGlobal(outside), Qt::LeftButton, Qt::LeftButton,
                      Qt::NoModifier);
@@ -143,8 +114,7 @@ void TouchEventButton::touchCancelEvent()
 
 void TouchEventButton::breakTouch()
 {
-    QTouchEvent cancel(QEvent::TouchCancel, QPointingDevice::primaryPointingDevice());
-    QCoreApplication::sendEvent(this, &cancel);
+    OneFinger::cancelTouchOf(this);
 }
 
 void TouchEventButton::sendRelease(const QPoint& position, const QPoint& screenPosition)

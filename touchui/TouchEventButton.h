@@ -1,5 +1,7 @@
 #pragma once
 
+#include "touchui/OneFinger.h"
+
 #include <QPoint>
 #include <QPushButton>
 #include <QRect>
@@ -29,6 +31,8 @@ public:
     // Ends the touch that is on it, without a click, and frees the touch lock that goes with it: for a button
     // that is taken away from under the finger and will not see it lifted.
     void breakTouch();
+    // True while the button comes up because its touch was cancelled, which is no release of the operator's.
+    bool isTouchCancelled() const { return m_touchCancelled; }
 
 Q_SIGNALS:
     // outside: the finger slid off the button; false: it was lifted on it.
@@ -38,7 +42,6 @@ Q_SIGNALS:
 
 protected:
     bool event(QEvent* event) override;
-    void changeEvent(QEvent* event) override;
     void mouseMoveEvent(QMouseEvent* event) override;
 
 private Q_SLOTS:
@@ -46,14 +49,15 @@ private Q_SLOTS:
 
 private:
     void init();
-    void touchCancelEvent();
+    void followMotion(const QTouchEvent* event);
+    void comeUp();
     void moveIntoWidget(QPoint& position, QPoint& screenPosition) const;
     void sendRelease(const QPoint& position, const QPoint& screenPosition);
 
-    int m_touchId = -1;
+    OneFinger m_finger{this};
     int m_pressCount = 0;
     QPoint m_lastPosition;
     QRect m_touchRect;
-    bool m_touching = false;
+    bool m_touchCancelled = false;
     bool m_releasedOutside = false;
 };

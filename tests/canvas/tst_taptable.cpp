@@ -32,7 +32,8 @@ private Q_SLOTS:
     void doubleTap();
     void doubleTapOnASelectedObject();
     void tapAfterADoubleTap();
-    void cancelledDragIsAStep();
+    void cancelledDragPutsTheObjectBack();
+    void cancelledTapChoosesNothing();
     void frameIsNoHandle();
     void secondFingerOnTheCanvas();
     void secondFingerOnAButton();
@@ -411,8 +412,8 @@ void tst_taptable::tapAfterADoubleTap()
     QCOMPARE(item->getFocusFlag(), int(GraphicsText::FocusEdit));
 }
 
-// When the system takes a touch away, the object stays where it is, and lets go of the finger.
-void tst_taptable::cancelledDragIsAStep()
+// The object returns to its place and lets go of the finger.
+void tst_taptable::cancelledDragPutsTheObjectBack()
 {
     TouchCanvas canvas(m_device);
     canvas.show();
@@ -426,17 +427,41 @@ void tst_taptable::cancelledDragIsAStep()
     QTouchEvent cancel(QEvent::TouchCancel, m_device);
     QCoreApplication::sendEvent(canvas.view.viewport(), &cancel);
     canvas.view.mouseClick();
-    QCOMPARE(item->scenePos(), place);
-    QCOMPARE(item->getItemTText()->getXValue(), float(place.x()));
-    QCOMPARE(canvas.stack.count(), 1);
+    QCOMPARE(item->scenePos(), QPointF(300.0, 200.0));
+    QCOMPARE(item->getItemTText()->getXValue(), 300.0F);
+    QCOMPARE(canvas.stack.count(), 0);
     QCOMPARE(canvas.scene->mouseGrabberItem(), nullptr);
     // A second one has nothing to end.
     QTouchEvent again(QEvent::TouchCancel, m_device);
     QCoreApplication::sendEvent(canvas.view.viewport(), &again);
-    QCOMPARE(canvas.stack.count(), 1);
     QCOMPARE(item->getFocusFlag(), int(GraphicsText::FocusObject));
+    canvas.touchDrag(from, from + QPoint(80, 40));
+    QCOMPARE(item->scenePos(), place);
+    QCOMPARE(canvas.stack.count(), 1);
     canvas.stack.undo();
     QCOMPARE(item->scenePos(), QPointF(300.0, 200.0));
+}
+
+void tst_taptable::cancelledTapChoosesNothing()
+{
+    TouchCanvas canvas(m_device);
+    canvas.show();
+    canvas.open({makeRecord("abc")});
+    GraphicsText* item = canvas.text(1);
+    QSignalSpy keyboard(item, &GraphicsText::signalNotifySceneCurrentObjectInEditMode);
+    for (const int flag : {int(GraphicsText::FocusNone), int(GraphicsText::FocusObject)}) {
+        QCOMPARE(item->getFocusFlag(), flag);
+        canvas.press(canvas.pointOn(1));
+        keyboard.clear();
+        canvas.view.cancelTouch();
+        canvas.release(canvas.pointOn(1));
+        QCOMPARE(item->getFocusFlag(), flag);
+        QCOMPARE(keyboard.count(), 0);
+        QCOMPARE(canvas.scene->mouseGrabberItem(), nullptr);
+        canvas.touchTap(canvas.pointOn(1));
+    }
+    QCOMPARE(item->getFocusFlag(), int(GraphicsText::FocusEdit));
+    QVERIFY(keyboard.count() > 0);
 }
 
 // The frame is drawn a little outside the text, where there is nothing to take hold of.

@@ -2,6 +2,8 @@
 // titles to other places.
 #include "TitleListFixture.h"
 
+#include "touchui/KSEventMutexLockObject.h"
+
 #include <QSignalSpy>
 #include <functional>
 
@@ -44,6 +46,8 @@ private Q_SLOTS:
     void floatingTitleLooksLikeTheOne();
     void closingTheFolderWhileCarrying();
     void cancelledCarryKeepsEveryTitle();
+    void lockDuringATapOpensNoMenu();
+    void lockWhileCarryingPutsTheTitleBack();
     void titleGoneFromUnderTheFinger_data();
     void titleGoneFromUnderTheFinger();
     void ninetyNineTitles();
@@ -532,9 +536,45 @@ void tst_ArchiveTouch::cancelledCarryKeepsEveryTitle()
     QTouchEvent cancel(QEvent::TouchCancel, mDevice);
     QCoreApplication::sendEvent(m->list->viewport(), &cancel);
     QVERIFY(!m->list->getMoveState());
-    QCOMPARE(m->list->count(), 4);
-    QCOMPARE(LibraryFixture::order(folder), m->stems());
+    QCOMPARE(m->stems(), numbered(4));
+    QCOMPARE(LibraryFixture::order(folder), numbered(4));
     m->release(List::HANDLE_X, 65 + List::ROW);
+}
+
+void tst_ArchiveTouch::lockDuringATapOpensNoMenu()
+{
+    openFolder(QStringLiteral("locked"), 4);
+    const std::unique_ptr<KSLockObject> lock(KSEventMutexLockObject::createFactory(nullptr));
+    m->press(List::PICTURE_X, List::ROW + 60);
+    m->mFilter.lock(lock.get());
+    m->release(List::PICTURE_X, List::ROW + 60);
+    m->clock.advance(2 * List::HOLD_TIME);
+    QVERIFY(!m->list->IsOptionMenuShowing());
+    m->mFilter.unlock();
+    m->takeCanvas();
+    m->tapTitle(2);
+    QCOMPARE(m->takeCanvas(), Names{"t02"});
+}
+
+void tst_ArchiveTouch::lockWhileCarryingPutsTheTitleBack()
+{
+    const QString folder = openFolder(QStringLiteral("locked"), 4);
+    const std::unique_ptr<KSLockObject> lock(KSEventMutexLockObject::createFactory(nullptr));
+    moveMode(true);
+    m->liftTo(0, 65 + 2 * List::ROW);
+    QVERIFY(m->list->isDragging());
+    m->mFilter.lock(lock.get());
+    QVERIFY(!m->list->isDragging());
+    QVERIFY(!m->list->getMoveState());
+    QVERIFY(!m->list->getMoveItem());
+    QCOMPARE(m->stems(), numbered(4));
+    QCOMPARE(LibraryFixture::order(folder), numbered(4));
+    QCOMPARE(m->stack.count(), 0);
+    m->release(List::HANDLE_X, 65 + 2 * List::ROW);
+    m->mFilter.unlock();
+    m->carry(0, 65 + 2 * List::ROW);
+    QCOMPARE(m->stems(), (Names{"t01", "t02", "t00", "t03"}));
+    QCOMPARE(m->stack.count(), 1);
 }
 
 void tst_ArchiveTouch::titleGoneFromUnderTheFinger_data()

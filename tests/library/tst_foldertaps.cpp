@@ -3,6 +3,7 @@
 // processes and the operation log are told.
 #include "FolderPickerFixture.h"
 #include "tests/support/LogFixture.h"
+#include "touchui/KSEventMutexLockObject.h"
 
 #include <QHeaderView>
 #include <QLabel>
@@ -115,6 +116,29 @@ private Q_SLOTS:
         QCOMPARE(f.current(), QStringLiteral("t2"));
         QCOMPARE(f.buttons(), QStringLiteral("-+++"));
         QVERIFY(thumbnail()->isVisible());
+    }
+
+    // --- A touch that a sibling's lock interrupts -----------------------------------------------------
+
+    void aLockUnderTheFingerRenamesNothing()
+    {
+        f.make("news", {"t1"});
+        f.make("sports", {});
+        f.open();
+        PathRecorder recorder;
+        const std::unique_ptr<KSLockObject> lock(KSEventMutexLockObject::createFactory(nullptr));
+        const QPoint news = f.tree()->viewport()->mapTo(f.picker.get(), f.place(f.row("news")));
+        f.tree()->setHoldInterval(0);
+        f.touch->press(f.picker.get(), news);
+        f.touch->filter->lock(lock.get());
+        f.touch->lift(f.picker.get(), news);
+        QTest::qWait(20);
+        QVERIFY(!f.picker->editor());
+        QCOMPARE(recorder.take(), QStringList());
+        f.touch->filter->unlock();
+        f.tree()->setHoldInterval(700);
+        f.tap("sports");
+        QCOMPARE(f.current(), QStringLiteral("sports"));
     }
 
     // --- Before a folder opens ------------------------------------------------------------------------

@@ -191,6 +191,24 @@ private Q_SLOTS:
         QCOMPARE(mPressed->size(), 1);
     }
 
+    // As when a dialog took it.
+    void aTouchAfterOneWithoutAnEnd()
+    {
+        touch().press(0, QPoint(150, 100));
+        QTouchEvent again(QEvent::TouchBegin, mDevice, Qt::NoModifier,
+                          {QEventPoint(1, QEventPoint::Pressed, QPointF(30, 30),
+                                       mButtons[5]->mapToGlobal(QPointF(30, 30)))});
+        QCoreApplication::sendEvent(mButtons[5], &again);
+        QTouchEvent end(QEvent::TouchEnd, mDevice, Qt::NoModifier,
+                        {QEventPoint(1, QEventPoint::Released, QPointF(30, 30),
+                                     mButtons[5]->mapToGlobal(QPointF(30, 30)))});
+        QCoreApplication::sendEvent(mButtons[5], &end);
+        QCOMPARE(mPressed->size(), 1);
+        QCOMPARE(pressed(0), mButtons[5]);
+        touch().release(0, QPoint(150, 100));
+        QCOMPARE(mPressed->size(), 1);
+    }
+
     // Its end never comes then.
     void theTouchedButtonGoes()
     {

@@ -1,4 +1,5 @@
 // Who may hold the touch: the lock kinds, the filter that asks them, and the lock between processes.
+#include "ManualClock.h"
 #include "touchui/ITitlerAPPEventFilterController.h"
 #include "touchui/KSAppEventFilter.h"
 #include "touchui/KSEventClusterLockObject.h"
@@ -8,10 +9,12 @@
 #include "touchui/KSEventProcessLockObject.h"
 #include "touchui/TouchEventButton.h"
 
+#include <QDialog>
 #include <QSignalSpy>
 #include <QTest>
-#include <QTimer>
 #include <QTouchEvent>
+
+#include <functional>
 
 using namespace APPEventDefine;
 
@@ -96,6 +99,10 @@ private Q_SLOTS:
     void cancelFreesTheLock();
     void anIgnoredTouchFreesTheLock();
     void forcedLockBreaksTheTouch();
+    void whatEndsATouchCancelsItAtItsHolder_data();
+    void whatEndsATouchCancelsItAtItsHolder();
+    void theEndOfATouchOnADisabledWidgetIsOnlySwallowed();
+    void anEndThatAFilterSwallowsIsCancelled();
     void registeredFiltersHearInOrder();
     void deletedFilterLeaves();
 
@@ -114,6 +121,8 @@ private:
     std::unique_ptr<QWidget> m_window;
     TouchEventButton* m_first = nullptr;
     TouchEventButton* m_second = nullptr;
+    std::unique_ptr<KSLockObject> m_forced;
+    std::unique_ptr<QDialog> m_dialog;
 };
 
 void TestEventLocks::initTestCase()
@@ -129,6 +138,7 @@ void TestEventLocks::init()
     m_filter = std::make_unique<KSAppEventFilter>();
     m_filter->registerLockObject(m_filter.get(), nullptr, LOCKOBJECT_DEFAULTMUTEX, nullptr);
     qApp->installEventFilter(m_filter.get());
+    m_forced.reset(KSEventMutexLockObject::createFactory(nullptr));
     m_window = std::make_unique<QWidget>();
     m_window->resize(400, 200);
     m_first = new TouchEventButton(QStringLiteral("first"), m_window.get());
@@ -141,6 +151,7 @@ void TestEventLocks::init()
 
 void TestEventLocks::cleanup()
 {
+    m_dialog.reset();
     m_window.reset();
     m_filter.reset();
     m_controller.reset();
@@ -239,20 +250,20 @@ void TestEventLocks::multiMutexRefusesOtherObjects()
 void TestEventLocks::defaultMutexWatchdog()
 {
     auto* lock = KSEventDefaultMutexLockObject::createFactory(m_filter.get(), nullptr);
-    auto* timer = lock->findChild<QTimer*>();
-    QVERIFY(timer != nullptr && !timer->isActive());
+    ManualClock clock;
     touch(m_first, 0);
-    QVERIFY(timer->isActive());
-    QCOMPARE(timer->interval(), 10000);
+    clock.advance(9999);
+    QVERIFY(lock->isLocked());
     // Each update of the holder starts the time anew; a second begin does not.
-    timer->start(5000);
-    QCOMPARE(lock->tryLock(m_first, LOCKMETHOD_TOUCH, nullptr), 0);
-    QCOMPARE(timer->interval(), 5000);
     QTest::touchEvent(m_first, m_device).move(0, QPoint(22, 20));
-    QCOMPARE(timer->interval(), 10000);
-    timer->start(0);
-    QTRY_VERIFY(!m_filter->isLock(nullptr, LOCKMETHOD_TOUCH));
+    clock.advance(9999);
+    QVERIFY(lock->isLocked());
+    QVERIFY(m_first->isDown());
+    QCOMPARE(lock->tryLock(m_first, LOCKMETHOD_TOUCH, nullptr), 0);
+    clock.advance(1);
+    QVERIFY(!m_filter->isLock(nullptr, LOCKMETHOD_TOUCH));
     QVERIFY(!lock->isLocked());
+    QVERIFY(!m_first->isDown());
     // The finger that held it is shut out until its next touch.
     QSignalSpy clicked(m_first, &QAbstractButton::clicked);
     lift(m_first, 0);
@@ -363,6 +374,7 @@ void TestEventLocks::aStrangersEndIsSwallowed()
     QVERIFY(!m_filter->isLock(nullptr, LOCKMETHOD_TOUCH));
 }
 
+// Those who come later need not wait for the watchdog.
 void TestEventLocks::aVanishedHolderIsCutOff()
 {
     auto* gone = new TouchEventButton;
@@ -372,16 +384,10 @@ void TestEventLocks::aVanishedHolderIsCutOff()
     QTest::touchEvent(gone, m_device).press(0, QPoint(20, 20));
     QVERIFY(gone->isDown());
     delete gone;
+    QVERIFY(!m_filter->isLock(nullptr, LOCKMETHOD_TOUCH));
     QSignalSpy clicked(m_second, &QAbstractButton::clicked);
     touch(m_second, 1);
     lift(m_second, 1);
-    QCOMPARE(clicked.count(), 0);
-    auto* lock = KSEventDefaultMutexLockObject::createFactory(m_filter.get(), nullptr);
-    QVERIFY(lock->isLocked());
-    lock->findChild<QTimer*>()->start(0);
-    QTRY_VERIFY(!lock->isLocked());
-    touch(m_second, 2);
-    lift(m_second, 2);
     QCOMPARE(clicked.count(), 1);
 }
 
@@ -500,6 +506,83 @@ void TestEventLocks::forcedLockBreaksTheTouch()
     lift(m_second, 0);
     m_filter->unlock();
     QVERIFY(!m_filter->isLock(nullptr, LOCKMETHOD_TOUCH));
+}
+
+void TestEventLocks::whatEndsATouchCancelsItAtItsHolder_data()
+{
+    QTest::addColumn<std::function<void()>>("end");
+    const auto row = [](const char* name, std::function<void()> end) { QTest::newRow(name) << end; };
+    row("a forced lock", [this] { m_filter->lock(m_forced.get()); });
+    row("unlocking", [this] { m_filter->unlock(); });
+    row("a reset, as by the watchdog", [this] { m_filter->resetLock(); });
+    row("disabling", [this] { m_first->setEnabled(false); });
+    row("disabling the window", [this] { m_window->setEnabled(false); });
+    row("hiding", [this] { m_first->hide(); });
+    row("hiding the window", [this] { m_window->hide(); });
+    row("a modal dialog", [this] {
+        m_dialog = std::make_unique<QDialog>();
+        m_dialog->setModal(true);
+        m_dialog->show();
+    });
+}
+
+void TestEventLocks::whatEndsATouchCancelsItAtItsHolder()
+{
+    QFETCH(std::function<void()>, end);
+    QSignalSpy clicked(m_first, &QAbstractButton::clicked);
+    touch(m_first, 0);
+    QVERIFY(m_first->isDown());
+    end();
+    QVERIFY(!m_first->isDown());
+    for (const QList<QObject*>& holders : m_filter->activateLockObjects()) {
+        QVERIFY(holders.isEmpty());
+    }
+    // Whatever it was is over; the finger is still there.
+    m_filter->unlock();
+    m_dialog.reset();
+    m_window->setEnabled(true);
+    m_window->show();
+    m_first->setEnabled(true);
+    m_first->show();
+    lift(m_first, 0);
+    QCOMPARE(clicked.count(), 0);
+    touch(m_first, 1);
+    QVERIFY(m_first->isDown());
+    lift(m_first, 1);
+    QCOMPARE(clicked.count(), 1);
+    QVERIFY(!m_filter->isLock(nullptr, LOCKMETHOD_TOUCH));
+}
+
+void TestEventLocks::theEndOfATouchOnADisabledWidgetIsOnlySwallowed()
+{
+    touch(m_second, 0);
+    m_first->setEnabled(false);
+    QTouchEvent end(QEvent::TouchEnd, m_device, Qt::NoModifier,
+                    {QEventPoint(1, QEventPoint::Released, QPointF(30, 30), QPointF(30, 30))});
+    QVERIFY(m_filter->doEventFilter(m_first, &end));
+    QVERIFY(m_filter->isLock(nullptr, LOCKMETHOD_TOUCH));
+    QVERIFY(m_second->isDown());
+    lift(m_second, 0);
+    QVERIFY(!m_filter->isLock(nullptr, LOCKMETHOD_TOUCH));
+}
+
+// A filter that comes to life while the finger is down.
+void TestEventLocks::anEndThatAFilterSwallowsIsCancelled()
+{
+    QSignalSpy clicked(m_first, &QAbstractButton::clicked);
+    touch(m_first, 0);
+    Listener eater;
+    eater.type = QEvent::TouchEnd;
+    eater.swallow = true;
+    m_filter->registerEventFilter(&eater);
+    lift(m_first, 0);
+    QCOMPARE(eater.count, 1);
+    QVERIFY(!m_first->isDown());
+    QCOMPARE(clicked.count(), 0);
+    m_filter->unegisterEventFilter(&eater);
+    touch(m_first, 0);
+    lift(m_first, 0);
+    QCOMPARE(clicked.count(), 1);
 }
 
 void TestEventLocks::registeredFiltersHearInOrder()

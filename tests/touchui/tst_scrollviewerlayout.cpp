@@ -32,6 +32,7 @@ private Q_SLOTS:
     void barShowsWhenNeeded();
     void barSides();
     void barsGoTogether();
+    void barStaysInItsPlace();
     void scrolledIsWhatWouldBePainted();
     void moving_data();
     void moving();
@@ -269,6 +270,27 @@ void TestScrollViewerLayout::barsGoTogether()
 }
 
 // What is moved on the screen must be what a full painting gives.
+// Also while nothing is shown, when the viewport does not scroll.
+void TestScrollViewerLayout::barStaysInItsPlace()
+{
+    m->fill(20);
+    const QRect place = m->mList->getVScrollBar()->geometry();
+    const auto scroll = [this](int value) { m->mList->slotSetScrollBarValue(value); };
+    scroll(m->maximum());
+    QCOMPARE(m->mList->getVScrollBar()->geometry(), place);
+    m->mWindow.hide();
+    scroll(0);
+    scroll(300);
+    QCOMPARE(m->mList->getVScrollBar()->geometry(), place);
+    m->mWindow.show();
+    QVERIFY(QTest::qWaitForWindowExposed(&m->mWindow));
+    QCOMPARE(m->mList->getVScrollBar()->geometry(), place);
+    m->mList->setUpdatesEnabled(false);
+    scroll(m->maximum());
+    m->mList->setUpdatesEnabled(true);
+    QCOMPARE(m->mList->getVScrollBar()->geometry(), place);
+}
+
 void TestScrollViewerLayout::scrolledIsWhatWouldBePainted()
 {
     QWidget above(&m->mWindow); // floats over a part of the list, as a lifted row does

@@ -1,6 +1,8 @@
 // The touch tree under real fingers and the mouse, through the application's filter.
 #include "TreeViewFixture.h"
 
+#include "touchui/KSEventMutexLockObject.h"
+
 class TestTreeView : public TreeViewFixture
 {
     Q_OBJECT
@@ -24,6 +26,8 @@ private Q_SLOTS:
     void trackedFingerLiftsFirst();
     void otherWidgetIsLockedOut();
     void cancelledTouchSelectsNothing();
+    void lockedUnderTheFingerItWorksAfterwards_data();
+    void lockedUnderTheFingerItWorksAfterwards();
     void hidingEndsEverything();
     void mouseTapsAndScrolls();
     void shortListDoesNotScroll();
@@ -292,6 +296,35 @@ void TestTreeView::cancelledTouchSelectsNothing()
     QVERIFY(!m_tree->currentIndex().isValid());
     touchTap(rowPoint(2));
     QCOMPARE(m_tree->currentIndex().row(), 2);
+}
+
+void TestTreeView::lockedUnderTheFingerItWorksAfterwards_data()
+{
+    QTest::addColumn<bool>("onTheHeader");
+    QTest::newRow("rows") << false;
+    QTest::newRow("header") << true;
+}
+
+void TestTreeView::lockedUnderTheFingerItWorksAfterwards()
+{
+    QFETCH(bool, onTheHeader);
+    const std::unique_ptr<KSLockObject> lock(KSEventMutexLockObject::createFactory(nullptr));
+    QWidget* const area = onTheHeader ? m_tree->header()->viewport() : m_area;
+    const QPoint point = onTheHeader ? QPoint(100, 20) : rowPoint(2);
+    QSignalSpy held(m_tree.get(), &KSTreeView::signalPressedAndHold);
+    QSignalSpy clicked(m_tree.get(), &KSTreeView::clicked);
+    QSignalSpy sorted(m_tree->header(), &QHeaderView::sectionClicked);
+    m_tree->setHoldInterval(0);
+    QTest::touchEvent(area, m_device).press(0, point, area);
+    m_filter->lock(lock.get());
+    QTest::touchEvent(area, m_device).release(0, point, area);
+    m_filter->unlock();
+    QCoreApplication::processEvents();
+    QCOMPARE(held.count() + clicked.count() + sorted.count(), 0);
+    m_tree->setHoldInterval(700);
+    QTest::touchEvent(area, m_device).press(0, point, area);
+    QTest::touchEvent(area, m_device).release(0, point, area);
+    QCOMPARE(clicked.count() + sorted.count(), 1);
 }
 
 void TestTreeView::hidingEndsEverything()

@@ -1,0 +1,61 @@
+// Notes every signal that widgets emit, whether somebody is connected or not.
+#pragma once
+
+#include <QByteArray>
+#include <QMetaMethod>
+#include <QPointer>
+#include <QStringList>
+#include <QWidget>
+#include <private/qobject_p.h>
+#include <utility>
+
+class SignalLog
+{
+public:
+    SignalLog()
+    {
+        s_log = this;
+        static QSignalSpyCallbackSet callbacks{&SignalLog::begin, nullptr, nullptr, nullptr};
+        qt_register_signal_spy_callbacks(&callbacks);
+    }
+    ~SignalLog()
+    {
+        qt_register_signal_spy_callbacks(nullptr);
+        s_log = nullptr;
+    }
+    SignalLog(const SignalLog&) = delete;
+    SignalLog& operator=(const SignalLog&) = delete;
+
+    // "name" of each signal since the last call, once, of this widget and those around it; of all widgets
+    // without one.
+    QStringList take(const QWidget* of = nullptr)
+    {
+        QStringList names;
+        for (const Entry& entry : std::exchange(m_entries, {})) {
+            const bool concerns =
+                of == nullptr || (entry.sender && entry.sender->isAncestorOf(of)) || entry.sender == of;
+            if (concerns && !names.contains(entry.name))
+                names.append(entry.name);
+        }
+        return names;
+    }
+
+private:
+    struct Entry {
+        QPointer<QWidget> sender;
+        QString name;
+    };
+
+    static void begin(QObject* sender, int index, void**)
+    {
+        if (s_log == nullptr || !sender->isWidgetType())
+            return;
+        const QMetaMethod method = QMetaObjectPrivate::signal(sender->metaObject(), index);
+        if (method.name() == "destroyed")
+            return;
+        s_log->m_entries.append({static_cast<QWidget*>(sender), QString::fromLatin1(method.name())});
+    }
+
+    static inline SignalLog* s_log = nullptr;
+    QList<Entry> m_entries;
+};

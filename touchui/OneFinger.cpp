@@ -1,0 +1,156 @@
+#include "touchui/OneFinger.h"
+
+#include "touchui/KSAppEventFilter.h"
+
+#include <QCoreApplication>
+#include <QEvent>
+#include <QEventPoint>
+#include <QPointingDevice>
+#include <QTouchEvent>
+#include <QWidget>
+
+OneFinger::OneFinger(QWidget* widget) : m_widget(widget)
+{
+    m_hold.setSingleShot(true);
+    connect(&m_hold, &TouchTimer::timeout, this, &OneFinger::held);
+    widget->installEventFilter(this);
+}
+
+OneFinger::Step OneFinger::follow(const QTouchEvent* event, QObject* receiver)
+{
+    if (receiver == nullptr) {
+        receiver = event->target() != nullptr ? event->target() : m_widget;
+    }
+    m_step = stepOf(event, receiver);
+    return m_step;
+}
+
+OneFinger::Step OneFinger::stepOf(const QTouchEvent* event, QObject* receiver)
+{
+    if (event->type() == QEvent::TouchBegin) {
+        return begin(event, receiver);
+    }
+    if (!isDown()) {
+        return Step::None;
+    }
+    if (event->type() == QEvent::TouchCancel) {
+        drop();
+        return Step::None;
+    }
+    if (m_receiver != receiver) {
+        return Step::None;
+    }
+    for (const QEventPoint& point : event->points()) {
+        if (point.id() != m_id) {
+            continue;
+        }
+        m_position = point.globalPosition();
+        // With another finger on the same object, the lift is an update of the event.
+        if (event->type() == QEvent::TouchUpdate && point.state() != QEventPoint::State::Released) {
+            return Step::Move;
+        }
+        letGo();
+        return Step::End;
+    }
+    if (event->type() == QEvent::TouchEnd) {
+        drop(); // all fingers are up, and this one's lift was lost
+    }
+    return Step::None;
+}
+
+OneFinger::Step OneFinger::begin(const QTouchEvent* event, QObject* receiver)
+{
+    if (event->points().isEmpty() || !m_widget->isEnabled()) {
+        return Step::None;
+    }
+    if (isDown()) {
+        if (!isLost(receiver)) {
+            return Step::None;
+        }
+        drop();
+    }
+    const QEventPoint& point = event->points().constFirst();
+    m_id = point.id();
+    m_receiver = receiver;
+    m_position = point.globalPosition();
+    m_pressPosition = m_position;
+    if (receiver != m_widget) {
+        connect(receiver, &QObject::destroyed, this, &OneFinger::receiverDestroyed, Qt::UniqueConnection);
+    }
+    return Step::Begin;
+}
+
+// Whether the finger that is followed cannot be down any more when a touch begins at the object. A second
+// finger on the same object would have joined the touch; on another object it is one too many, as long as the
+// first one's object has its touch.
+bool OneFinger::isLost(const QObject* receiver) const
+{
+    if (receiver == m_receiver) {
+        return true;
+    }
+    KSAppEventFilter* gate = KSAppEventFilter::current();
+    return gate != nullptr && !gate->isTouched(m_receiver);
+}
+
+void OneFinger::cancel()
+{
+    if (isDown()) {
+        const QPointer<OneFinger> self = this;
+        cancelTouchOf(m_receiver); // comes by as a cancelled touch, unless somebody keeps it
+        if (self == nullptr || !isDown()) {
+            return;
+        }
+    } else if (!m_hold.isActive()) {
+        return;
+    }
+    letGo();
+    Q_EMIT cancelled();
+}
+
+void OneFinger::cancelTouchOf(QObject* object)
+{
+    QTouchEvent cancel(QEvent::TouchCancel, QPointingDevice::primaryPointingDevice());
+    QCoreApplication::sendEvent(object, &cancel);
+}
+
+QPointF OneFinger::positionIn(const QWidget* widget) const
+{
+    return widget->mapFromGlobal(m_position);
+}
+
+void OneFinger::startHold(int milliseconds)
+{
+    m_hold.start(milliseconds);
+}
+
+void OneFinger::letGo()
+{
+    if (m_receiver != nullptr && m_receiver != m_widget) {
+        disconnect(m_receiver, &QObject::destroyed, this, &OneFinger::receiverDestroyed);
+    }
+    m_id = NONE;
+    m_receiver.clear();
+    m_hold.stop();
+}
+
+void OneFinger::drop()
+{
+    letGo();
+    Q_EMIT cancelled();
+}
+
+void OneFinger::receiverDestroyed()
+{
+    if (isDown() && m_receiver == nullptr) {
+        drop();
+    }
+}
+
+bool OneFinger::eventFilter(QObject* object, QEvent* event)
+{
+    if (object == m_widget && (event->type() == QEvent::Hide ||
+                               (event->type() == QEvent::EnabledChange && !m_widget->isEnabled()))) {
+        cancel();
+    }
+    return QObject::eventFilter(object, event);
+}
