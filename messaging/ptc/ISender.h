@@ -3,6 +3,8 @@
 
 #include "messaging/ptc/IObject.h"
 
+#include <chrono>
+
 namespace PTC
 {
 
@@ -15,6 +17,10 @@ public:
     virtual void send(Event* event) = 0;
     // False when the peer is known to be gone, so that nothing that is sent can arrive.
     virtual bool isConnected() const { return true; }
+    // As isConnected; a connection that was lost is begun anew, without waiting for it.
+    virtual bool reconnect() { return isConnected(); }
+    // Ends the sending: what still waits has until the deadline, and later calls are dropped.
+    virtual void finish(std::chrono::steady_clock::time_point) {}
 };
 
 class IRemoteSender : public ISender

@@ -6,12 +6,24 @@
 namespace PTC
 {
 
+namespace
+{
+
+// For the last calls to all peers together.
+constexpr std::chrono::seconds FINISH_TIME(1);
+
+} // namespace
+
 InstanceFactory::InstanceFactory() = default;
 
 InstanceFactory::~InstanceFactory()
 {
     // Ends the threads before anything that a call could still use goes.
     m_remoteReceiver.reset();
+    const auto deadline = std::chrono::steady_clock::now() + FINISH_TIME;
+    for (const auto& [key, sender] : m_senders) {
+        sender->finish(deadline);
+    }
 }
 
 bool InstanceFactory::initialize()

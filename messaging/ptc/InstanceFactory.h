@@ -18,6 +18,7 @@ class InstanceFactory : public IInstanceFactory, public IAdapterFactory, public 
 {
 public:
     InstanceFactory();
+    // Gives the last calls to all peers together a second to go out.
     ~InstanceFactory() override;
     InstanceFactory(const InstanceFactory&) = delete;
     InstanceFactory& operator=(const InstanceFactory&) = delete;

@@ -56,7 +56,7 @@ long Proxy::getRRIdentity()
 
 bool Proxy::isConnected() const
 {
-    return m_sender != nullptr && m_sender->isConnected();
+    return m_sender != nullptr && m_sender->reconnect();
 }
 
 } // namespace PTC

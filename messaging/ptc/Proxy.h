@@ -24,7 +24,7 @@ public:
     virtual void destoryAdapter(long id);
     // The client number of this process.
     virtual long getRRIdentity();
-    // False when the process of the service is known to be gone.
+    // False when the process of the service is known to be gone. It is looked for again with each question.
     bool isConnected() const;
 
 private:

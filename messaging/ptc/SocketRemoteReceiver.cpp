@@ -2,10 +2,10 @@
 
 #include "messaging/ptc/EventPacket.h"
 #include "messaging/ptc/SocketFrame.h"
+#include "messaging/ptc/WorkerSignals.h"
 
 #include <netinet/in.h>
 #include <netinet/tcp.h>
-#include <signal.h>
 #include <sys/socket.h>
 #include <unistd.h>
 
@@ -19,23 +19,11 @@ namespace
 {
 
 const int LISTEN_BACKLOG = 10;
-const boost::posix_time::milliseconds ACCEPT_PAUSE(500);
 
 void printLine(const char* text)
 {
     std::puts(text);
     std::fflush(stdout);
-}
-
-// Signals are for the main thread; here they would only cut system calls short. Faults stay with the thread.
-void leaveSignalsToMainThread()
-{
-    sigset_t signals;
-    sigfillset(&signals);
-    for (const int fault : {SIGSEGV, SIGBUS, SIGFPE, SIGILL, SIGABRT}) {
-        sigdelset(&signals, fault);
-    }
-    pthread_sigmask(SIG_BLOCK, &signals, nullptr);
 }
 
 long readLong(const char* frame, long offset)
@@ -46,12 +34,6 @@ long readLong(const char* frame, long offset)
 }
 
 } // namespace
-
-struct SocketRemoteReceiver::ClientStart {
-    SocketRemoteReceiver* receiver;
-    int socket;
-    std::shared_ptr<std::atomic<bool>> finished;
-};
 
 SocketRemoteReceiver::SocketRemoteReceiver(long id) : PTC::RemoteReceiver(id)
 {
@@ -69,13 +51,18 @@ SocketRemoteReceiver::~SocketRemoteReceiver()
         m_acceptThread->interrupt();
         m_acceptThread->join();
     }
-    for (const int socket : m_clientSockets) {
-        shutdown(socket, SHUT_RDWR);
+    {
+        const std::lock_guard<std::mutex> lock(m_connectionMutex);
+        for (const Connection& connection : m_connections) {
+            if (!connection.ended) {
+                shutdown(connection.socket, SHUT_RDWR);
+            }
+        }
     }
-    for (const ClientThread& client : m_clientThreads) {
-        client.thread->join();
+    for (const Connection& connection : m_connections) {
+        connection.thread->join();
     }
-    for (const int socket : m_clientSockets) {
+    for (const int socket : m_endedSockets) {
         close(socket);
     }
     if (listenSocket != -1) {
@@ -142,7 +129,7 @@ void SocketRemoteReceiver::run()
 
 void SocketRemoteReceiver::connectListeners(void* receiver)
 {
-    leaveSignalsToMainThread();
+    WorkerSignals::leaveToMainThread();
     try {
         static_cast<SocketRemoteReceiver*>(receiver)->waitClientLink();
     } catch (const boost::thread_interrupted&) {
@@ -154,6 +141,10 @@ void SocketRemoteReceiver::waitClientLink()
 {
     const int listenSocket = m_listenSocket;
     while (!m_stopping) {
+        if (!hasRoomForOneMore()) {
+            pauseAccepting();
+            continue;
+        }
         const int client = accept4(listenSocket, nullptr, nullptr, SOCK_CLOEXEC);
         if (m_stopping) {
             if (client != -1) {
@@ -166,52 +157,74 @@ void SocketRemoteReceiver::waitClientLink()
             if (errno != ECONNABORTED && errno != EINTR) {
                 // Out of descriptors or memory: the pending connection stays, and trying at once would only
                 // spin.
-                boost::this_thread::sleep(ACCEPT_PAUSE);
+                pauseAccepting();
             }
             continue;
         }
         addClientThread(client);
-        boost::this_thread::sleep(ACCEPT_PAUSE);
+        pauseAccepting();
     }
+}
+
+void SocketRemoteReceiver::pauseAccepting() const
+{
+    boost::this_thread::sleep(boost::posix_time::milliseconds(m_acceptPauseMs));
+}
+
+bool SocketRemoteReceiver::hasRoomForOneMore()
+{
+    joinEndedThreads();
+    return m_connections.size() < MAX_OPEN_CONNECTIONS;
 }
 
 void SocketRemoteReceiver::addClientThread(int socket)
 {
     const int on = 1;
     setsockopt(socket, IPPROTO_TCP, TCP_NODELAY, &on, sizeof on);
-    joinFinishedThreads();
     m_lastClientSocket = socket;
-    m_clientSockets.push_back(socket);
-    auto finished = std::make_shared<std::atomic<bool>>(false);
-    auto start = std::make_unique<ClientStart>(ClientStart{this, socket, finished});
+    const std::lock_guard<std::mutex> lock(m_connectionMutex);
+    Connection& connection = m_connections.emplace_back();
+    connection.receiver = this;
+    connection.socket = socket;
     try {
-        auto thread = std::make_unique<boost::thread>(&SocketRemoteReceiver::ThreadEntry, start.get());
-        static_cast<void>(start.release()); // the thread deletes it
-        m_clientThreads.push_back({std::move(thread), std::move(finished)});
+        connection.thread = std::make_unique<boost::thread>(&SocketRemoteReceiver::ThreadEntry, &connection);
     } catch (const boost::thread_resource_error&) {
         printLine("[Error]bad client!");
-        m_clientSockets.pop_back();
+        m_connections.pop_back();
         close(socket);
     }
 }
 
-void SocketRemoteReceiver::joinFinishedThreads()
+void SocketRemoteReceiver::joinEndedThreads()
 {
-    std::erase_if(m_clientThreads, [](const ClientThread& client) {
-        if (!*client.finished) {
-            return false;
+    const boost::this_thread::disable_interruption toTheEnd;
+    const std::lock_guard<std::mutex> lock(m_connectionMutex);
+    std::erase_if(m_connections, [](const Connection& connection) {
+        if (connection.ended) {
+            connection.thread->join();
         }
-        client.thread->join();
-        return true;
+        return connection.ended;
     });
 }
 
 void SocketRemoteReceiver::ThreadEntry(void* start)
 {
-    leaveSignalsToMainThread();
-    const std::unique_ptr<ClientStart> client(static_cast<ClientStart*>(start));
-    client->receiver->ThreadMain(client->socket);
-    *client->finished = true;
+    WorkerSignals::leaveToMainThread();
+    auto* connection = static_cast<Connection*>(start);
+    connection->receiver->ThreadMain(connection->socket);
+    connection->receiver->keepEndedSocket(*connection);
+}
+
+// Called as the last act of a connection's thread.
+void SocketRemoteReceiver::keepEndedSocket(Connection& connection)
+{
+    const std::lock_guard<std::mutex> lock(m_connectionMutex);
+    m_endedSockets.push_back(connection.socket);
+    if (m_endedSockets.size() > MAX_ENDED_CONNECTIONS) {
+        close(m_endedSockets.front());
+        m_endedSockets.pop_front();
+    }
+    connection.ended = true;
 }
 
 int SocketRemoteReceiver::ThreadMain(int socket)

@@ -1,31 +1,27 @@
 #include "messaging/ptc/SocketRemoteSender.h"
 
 #include "messaging/ptc/Event.h"
+#include "messaging/ptc/WorkerSignals.h"
+#include "support/LogManager.h"
 
-#include <netinet/in.h>
-#include <netinet/tcp.h>
-#include <poll.h>
-#include <sys/socket.h>
-#include <unistd.h>
-
-#include <algorithm>
-#include <cerrno>
 #include <chrono>
 #include <cstdint>
-#include <cstdio>
 #include <cstring>
 #include <memory>
+#include <string>
+#include <system_error>
+#include <utility>
+
+using Outcome = ClientSocket::Outcome;
 
 namespace
 {
 
-const int DRAIN_SIZE = 10;
-
-void printLine(const char* text)
-{
-    std::puts(text);
-    std::fflush(stdout);
-}
+constexpr int DRAIN_SIZE = 10;
+// A refusal on the loopback address comes at once; a busy machine may take a moment.
+constexpr int REFUSAL_MS = 20;
+constexpr std::chrono::milliseconds DELIVERY_POLL(5);
+constexpr int LOG_NUMBER = 200;
 
 } // namespace
 
@@ -35,64 +31,106 @@ SocketRemoteSender::SocketRemoteSender(long id) : PTC::RemoteSender(id)
 
 SocketRemoteSender::~SocketRemoteSender()
 {
-    closeSocket();
+    SocketRemoteSender::finish(std::chrono::steady_clock::now() +
+                               std::chrono::milliseconds(FINISH_TIMEOUT_MS));
+}
+
+void SocketRemoteSender::setConnectTimeout(int milliseconds)
+{
+    const Lock lock(m_mutex);
+    m_connectTimeoutMs = milliseconds;
+}
+
+unsigned short SocketRemoteSender::port()
+{
+    return SocketFrame::portOf(getIdentity());
 }
 
 bool SocketRemoteSender::initialize(long identity)
 {
-    PTC::RemoteSender::initialize(identity);
+    {
+        Lock lock(m_mutex);
+        stopWork(lock);
+        PTC::RemoteSender::initialize(identity);
+    }
     return connectServer() == 0;
 }
 
 int SocketRemoteSender::connectServer()
 {
-    closeSocket();
-    m_socket = socket(AF_INET, SOCK_STREAM | SOCK_CLOEXEC, 0);
-    if (m_socket == -1) {
-        printLine("[Error]Socket Server create failed!");
-        return -1;
+    Lock lock(m_mutex);
+    stopWork(lock);
+    m_waiting.clear();
+    Outcome outcome = m_socket.beginConnect(port());
+    if (outcome == Outcome::Pending) {
+        m_socket.waitUntilConnected(m_connectTimeoutMs);
+        outcome = m_socket.finishConnect();
     }
-    const int on = 1;
-    if (setsockopt(m_socket, SOL_SOCKET, SO_REUSEADDR, &on, sizeof on) != 0) {
-        printLine("[Error]Socket client reuse address failed!");
-        closeSocket();
-        return -1;
-    }
-    const int bufferSize = SocketFrame::RECEIVE_BUFFER_SIZE;
-    if (setsockopt(m_socket, SOL_SOCKET, SO_RCVBUF, &bufferSize, sizeof bufferSize) != 0) {
-        printLine("[Error]Socket client set send buffer failed!");
-        closeSocket();
-        return -1;
-    }
-    setsockopt(m_socket, IPPROTO_TCP, TCP_NODELAY, &on, sizeof on);
-    sockaddr_in address{};
-    address.sin_family = AF_INET;
-    address.sin_addr.s_addr = htonl(INADDR_LOOPBACK);
-    address.sin_port = htons(SocketFrame::portOf(getIdentity()));
-    if (address.sin_port == 0 ||
-        connect(m_socket, reinterpret_cast<sockaddr*>(&address), sizeof address) != 0) {
-        closeSocket();
+    if (outcome != Outcome::Done) {
+        m_socket.close();
         return -1;
     }
     return 0;
 }
 
+bool SocketRemoteSender::beginConnect(long identity)
+{
+    Lock lock(m_mutex);
+    if (getIdentity() != identity) {
+        stopWork(lock);
+        m_waiting.clear();
+        m_socket.close();
+        PTC::RemoteSender::initialize(identity);
+    }
+    if (m_isWorking) {
+        return true;
+    }
+    Outcome outcome = ensureConnection();
+    if (outcome == Outcome::Pending) {
+        m_socket.waitUntilConnected(REFUSAL_MS);
+        outcome = m_socket.finishConnect();
+    }
+    if (outcome == Outcome::Pending) {
+        startWork();
+    }
+    return outcome != Outcome::Failed;
+}
+
+// Done when the connection stands, else what came of beginning it anew.
+Outcome SocketRemoteSender::ensureConnection()
+{
+    if (m_socket.isOpen() && !m_socket.peerHasClosed()) {
+        return Outcome::Done;
+    }
+    return m_socket.beginConnect(port());
+}
+
 void SocketRemoteSender::send(PTC::Event* event)
 {
     const std::unique_ptr<PTC::Event> owner(event);
-    if (event == nullptr || m_socket == -1 || event->getSize() < 0 ||
-        event->getSize() > SocketFrame::MAX_PAYLOAD) {
+    if (event == nullptr || event->getSize() < 0 || event->getSize() > SocketFrame::MAX_PAYLOAD) {
         return;
     }
-    fillFrame(*event);
-    drainAcknowledgements();
-    if (!sendFrame()) {
-        // Half a frame may be out: whatever followed it would be read in the wrong place.
-        closeSocket();
+    Lock lock(m_mutex);
+    if (m_isFinished || getIdentity() == -1) {
+        return;
+    }
+    const long used = packFrame(*event);
+    long sent = 0;
+    switch (m_isWorking ? Outcome::Pending : sendAtOnce(used, sent)) {
+    case Outcome::Done:
+        m_isLosing = false;
+        break;
+    case Outcome::Pending:
+        keep(lock, used, sent);
+        break;
+    case Outcome::Failed:
+        lose(lock, Loss::NotReached);
+        break;
     }
 }
 
-void SocketRemoteSender::fillFrame(const PTC::Event& event)
+long SocketRemoteSender::packFrame(const PTC::Event& event)
 {
     const auto putLong = [this](long offset, std::int64_t value) {
         std::memcpy(m_frame.data() + offset, &value, sizeof value);
@@ -105,92 +143,215 @@ void SocketRemoteSender::fillFrame(const PTC::Event& event)
     putLong(SocketFrame::SIZE, event.getSize());
     m_frame[SocketFrame::IS_CALLBACK] = event.isCallback() ? 1 : 0;
     m_frame[SocketFrame::IS_REMOTE] = event.isRemote() ? 1 : 0;
-
     const long size = event.getData() != nullptr ? event.getSize() : 0;
     if (size > 0) {
         std::memcpy(m_frame.data() + SocketFrame::HEADER_SIZE, event.getData(),
                     static_cast<std::size_t>(size));
     }
-    const long end = SocketFrame::HEADER_SIZE + size;
-    if (end < m_usedBytes) {
-        std::fill(m_frame.begin() + end, m_frame.begin() + m_usedBytes, '\0');
-    }
-    m_usedBytes = end;
+    return SocketFrame::HEADER_SIZE + size;
 }
 
-void SocketRemoteSender::drainAcknowledgements()
+// A peer that has gone may be there again: the frame gets a second connection, whole.
+Outcome SocketRemoteSender::sendAtOnce(long used, long& sent)
 {
-    char scratch[DRAIN_SIZE];
-    [[maybe_unused]] const ssize_t taken = recv(m_socket, scratch, sizeof scratch, MSG_DONTWAIT);
+    for (int connection = 0; connection < 2; ++connection) {
+        const Outcome connected = ensureConnection();
+        if (connected != Outcome::Done) {
+            return connected;
+        }
+        m_socket.takeAcknowledgements(DRAIN_SIZE);
+        const Outcome outcome = m_socket.writeFrame(m_frame.data(), used, sent);
+        if (outcome != Outcome::Failed) {
+            return outcome;
+        }
+        m_socket.close();
+        sent = 0;
+    }
+    return Outcome::Failed;
 }
 
-bool SocketRemoteSender::sendFrame()
+// The newest calls are worth most to a peer that reads again: they say what holds by then.
+void SocketRemoteSender::keep(Lock& lock, long used, long sent)
 {
-    long sent = 0;
-    while (sent < SocketFrame::FRAME_SIZE) {
-        const ssize_t count =
-            ::send(m_socket, m_frame.data() + sent, static_cast<std::size_t>(SocketFrame::FRAME_SIZE - sent),
-                   MSG_NOSIGNAL | MSG_DONTWAIT);
-        if (count > 0) {
-            sent += count;
-        } else if (count == -1 && (errno == EAGAIN || errno == EWOULDBLOCK)) {
-            if (!waitForRoom()) {
-                return false;
-            }
-        } else if (count == 0 || errno != EINTR) {
-            return false;
-        }
+    if (m_waiting.empty()) {
+        m_firstSent = sent;
+        m_firstWasBegunAnew = false;
     }
-    return true;
+    m_waiting.emplace_back(m_frame.begin(), m_frame.begin() + used);
+    startWork();
+    if (m_waiting.size() > MAX_WAITING_FRAMES) {
+        m_waiting.erase(m_firstSent > 0 ? m_waiting.begin() + 1 : m_waiting.begin());
+        lose(lock, m_socket.isOpen() ? Loss::NotRead : Loss::NotReached);
+    }
 }
 
-// Acknowledgements are taken meanwhile: a peer that is held up in sending them would never read on.
-bool SocketRemoteSender::waitForRoom()
+// Writes the log line of an outage, once. The lock is released meanwhile.
+void SocketRemoteSender::lose(Lock& lock, Loss loss)
 {
-    using Clock = std::chrono::steady_clock;
-    const auto deadline = Clock::now() + std::chrono::milliseconds(m_sendTimeoutMs);
-    while (true) {
-        const auto left =
-            std::chrono::duration_cast<std::chrono::milliseconds>(deadline - Clock::now()).count();
-        if (left <= 0) {
-            return false;
-        }
-        pollfd state{m_socket, POLLIN | POLLOUT, 0};
-        const int ready = poll(&state, 1, static_cast<int>(left));
-        if (ready == -1 && errno != EINTR) {
-            return false;
-        }
-        if (ready <= 0) {
-            continue;
-        }
-        if ((state.revents & POLLIN) != 0) {
-            char scratch[512];
-            if (recv(m_socket, scratch, sizeof scratch, MSG_DONTWAIT) == 0) {
-                return false; // the peer has closed
-            }
-        }
-        if ((state.revents & (POLLERR | POLLHUP)) != 0) {
-            return false;
-        }
-        if ((state.revents & POLLOUT) != 0) {
-            return true;
-        }
+    if (m_isLosing) {
+        return;
     }
+    m_isLosing = true;
+    const std::wstring peer = L"port " + std::to_wstring(port());
+    lock.unlock();
+    LOG_DEBUG_OPERATE(L"SocketRemoteSender", LOG_NUMBER,
+                      loss == Loss::NotRead ? L"The process at " + peer + L" does not read: calls are lost"
+                                            : L"Nobody is reached at " + peer + L": calls are lost");
+    lock.lock();
+}
+
+void SocketRemoteSender::loseWaiting(Lock& lock)
+{
+    m_socket.close();
+    if (m_waiting.empty()) {
+        return;
+    }
+    m_waiting.clear();
+    m_firstSent = 0;
+    lose(lock, Loss::NotReached);
 }
 
 bool SocketRemoteSender::isConnected() const
 {
-    if (m_socket == -1) {
-        return false;
-    }
-    pollfd state{m_socket, POLLRDHUP, 0};
-    return poll(&state, 1, 0) == 0;
+    const Lock lock(m_mutex);
+    return m_socket.isOpen() && !m_socket.peerHasClosed();
 }
 
-void SocketRemoteSender::closeSocket()
+bool SocketRemoteSender::reconnect()
 {
-    if (m_socket != -1) {
-        close(m_socket);
-        m_socket = -1;
+    Lock lock(m_mutex);
+    if (m_isWorking) {
+        return m_socket.isOpen();
+    }
+    if (getIdentity() == -1 || m_isFinished) {
+        return false;
+    }
+    const Outcome outcome = ensureConnection();
+    if (outcome == Outcome::Pending) {
+        startWork();
+    }
+    return outcome == Outcome::Done;
+}
+
+// The working thread.
+
+void SocketRemoteSender::startWork()
+{
+    if (m_isWorking) {
+        return;
+    }
+    if (m_worker.joinable()) {
+        m_worker.join(); // it has left its last locked section
+    }
+    try {
+        m_worker = std::thread(&SocketRemoteSender::work, this);
+        m_isWorking = true;
+    } catch (const std::system_error&) {
+        m_socket.close(); // half a frame may be out: whatever followed it would be read in the wrong place
+        m_waiting.clear();
+    }
+}
+
+// Without thread and lock nothing of the waiting frames changes.
+void SocketRemoteSender::stopWork(Lock& lock)
+{
+    if (m_isWorking) {
+        m_isAbandoned = true;
+        m_socket.interrupt();
+        m_workEnded.wait(lock, [this] { return !m_isWorking; });
+        m_isAbandoned = false;
+        m_socket.close();
+    }
+    if (m_worker.joinable()) {
+        m_worker.join();
+    }
+}
+
+void SocketRemoteSender::work()
+{
+    WorkerSignals::leaveToMainThread();
+    Lock lock(m_mutex);
+    while (!m_isAbandoned && (m_socket.isConnecting() || !m_waiting.empty())) {
+        if (m_socket.isConnecting()) {
+            completeConnection(lock);
+        } else {
+            sendNextWaiting(lock);
+        }
+    }
+    m_isWorking = false;
+    m_workEnded.notify_all();
+}
+
+void SocketRemoteSender::completeConnection(Lock& lock)
+{
+    const int timeout = m_connectTimeoutMs;
+    lock.unlock();
+    m_socket.waitUntilConnected(timeout);
+    lock.lock();
+    if (m_isAbandoned || m_socket.finishConnect() == Outcome::Done) {
+        return;
+    }
+    loseWaiting(lock);
+}
+
+void SocketRemoteSender::sendNextWaiting(Lock& lock)
+{
+    if (!m_socket.isOpen()) {
+        // One new connection a frame, so that a peer that closes each one is not connected to for ever.
+        m_firstSent = 0;
+        if (std::exchange(m_firstWasBegunAnew, true) || m_socket.beginConnect(port()) == Outcome::Failed) {
+            loseWaiting(lock);
+        }
+        return;
+    }
+    const std::vector<char>& frame = m_waiting.front();
+    switch (m_socket.writeFrame(frame.data(), static_cast<long>(frame.size()), m_firstSent)) {
+    case Outcome::Done:
+        m_waiting.pop_front();
+        m_firstSent = 0;
+        m_firstWasBegunAnew = false;
+        if (m_waiting.empty()) {
+            m_isLosing = false;
+        }
+        break;
+    case Outcome::Pending: {
+        lock.unlock();
+        const bool hasRoom = m_socket.waitForRoom();
+        lock.lock();
+        if (!hasRoom) {
+            m_socket.close();
+        }
+        break;
+    }
+    case Outcome::Failed:
+        m_socket.close();
+        break;
+    }
+}
+
+void SocketRemoteSender::finish(std::chrono::steady_clock::time_point deadline)
+{
+    Lock lock(m_mutex);
+    if (m_isFinished) {
+        return;
+    }
+    m_isFinished = true;
+    m_workEnded.wait_until(lock, deadline, [this] { return !m_isWorking; });
+    if (!m_isWorking) {
+        waitUntilDelivered(deadline);
+    }
+    stopWork(lock);
+    m_socket.close();
+}
+
+// Closing with acknowledgements unread resets the connection, which takes away what has not yet arrived.
+void SocketRemoteSender::waitUntilDelivered(std::chrono::steady_clock::time_point deadline)
+{
+    while (m_socket.undelivered() > 0 && !m_socket.peerHasClosed()) {
+        if (std::chrono::steady_clock::now() >= deadline) {
+            m_socket.takeAcknowledgements(SocketFrame::FRAME_SIZE);
+            return;
+        }
+        std::this_thread::sleep_for(DELIVERY_POLL);
     }
 }

@@ -162,6 +162,13 @@ public:
         }
     }
 
+    // The end of the connection leaves nothing behind in the system.
+    void resetAtEnd() const
+    {
+        const linger none{1, 0};
+        setsockopt(m_socket, SOL_SOCKET, SO_LINGER, &none, sizeof none);
+    }
+
     bool nothingToRead()
     {
         char byte = 0;

@@ -9,6 +9,7 @@
 #include "tests/messaging/TestPorts.h"
 #include "tests/messaging/TestSocket.h"
 
+#include <QDir>
 #include <QTest>
 
 #include <csignal>
@@ -26,6 +27,11 @@ QByteArray frame(qint64 receiver, qint64 object, qint64 method, const QByteArray
                  bool callback = false)
 {
     return TestSocket::frame(receiver, object, method, callback, payload.size(), true, payload);
+}
+
+int openDescriptors()
+{
+    return int(QDir("/proc/self/fd").entryList(QDir::Files | QDir::System | QDir::NoDotAndDotDot).size());
 }
 
 } // namespace
@@ -50,6 +56,8 @@ private Q_SLOTS:
     void peerDiesInTheMiddleOfAFrame();
     void silentPeersHoldNobodyUp();
     void dozensOfConnections();
+    void fiveThousandReconnections();
+    void openConnectionsAreLimited();
     void randomFrames();
     void floodIsHeldUp();
     void destructionWhileHeldUp();
@@ -62,7 +70,6 @@ private Q_SLOTS:
     void senderDrainsAtMostTenBytes();
     void senderToNobody();
     void senderWhosePeerDied();
-    void senderGivesUpAStuckPeer();
     void senderSurvivesABlockedPeer();
 
 private:
@@ -240,6 +247,53 @@ void TestTransport::dozensOfConnections()
     QTRY_COMPARE_WITH_TIMEOUT(m_adapter->calls.size(), 4, 60000);
 }
 
+void TestTransport::fiveThousandReconnections()
+{
+    m_server.reset();
+    m_server = std::make_unique<SocketRemoteReceiver>(0);
+    m_server->setAcceptPause(0);
+    QVERIFY(m_server->initialize(SERVER));
+    const int before = openDescriptors();
+    for (int i = 0; i < 5000; ++i) {
+        TestSocket peer(SERVER);
+        QVERIFY(peer.write("x"));
+        QCOMPARE(peer.read(3), QByteArray("OK\0", 3));
+        peer.resetAtEnd();
+        if (i % 500 == 0) {
+            QVERIFY(openDescriptors() <= before + SocketRemoteReceiver::MAX_ENDED_CONNECTIONS + 3);
+        }
+    }
+    // The sockets of those that ended last are kept.
+    QTRY_COMPARE(openDescriptors(), before + SocketRemoteReceiver::MAX_ENDED_CONNECTIONS);
+    m_server.reset();
+    QVERIFY(openDescriptors() < before);
+}
+
+void TestTransport::openConnectionsAreLimited()
+{
+    m_server.reset();
+    m_server = std::make_unique<SocketRemoteReceiver>(0);
+    m_server->setAcceptPause(1);
+    QVERIFY(m_server->initialize(SERVER));
+    std::vector<std::unique_ptr<TestSocket>> peers;
+    for (int i = 0; i < SocketRemoteReceiver::MAX_OPEN_CONNECTIONS; ++i) {
+        peers.push_back(std::make_unique<TestSocket>(SERVER));
+        QVERIFY(peers.back()->write("x"));
+        QCOMPARE(peers.back()->read(3).size(), qsizetype(3));
+    }
+    // One more waits until another ends, and then is served.
+    TestSocket waiting(SERVER);
+    QVERIFY(waiting.write("x"));
+    QVERIFY(waiting.nothingToRead());
+    peers.erase(peers.begin() + 7);
+    QCOMPARE(waiting.read(3), QByteArray("OK\0", 3));
+    // The others have not been touched.
+    for (const auto& peer : peers) {
+        QVERIFY(peer->write("y"));
+        QCOMPARE(peer->read(3).size(), qsizetype(3));
+    }
+}
+
 void TestTransport::randomFrames()
 {
     TestSocket peer(SERVER);
@@ -411,26 +465,6 @@ void TestTransport::senderWhosePeerDied()
         sender.send(new PTC::Event(1, 1, payload, 4, true, false));
     }
     QVERIFY(!sender.isConnected());
-}
-
-void TestTransport::senderGivesUpAStuckPeer()
-{
-    m_server.reset();
-    TestListener listener(SERVER);
-    SocketRemoteSender sender(4);
-    sender.setSendTimeout(200);
-    QVERIFY(sender.initialize(SERVER));
-    TestSocket peer = listener.accept();
-    char payload[4] = {};
-    for (int i = 0; i < 2000 && sender.isConnected(); ++i) {
-        sender.send(new PTC::Event(1, i, payload, 4, true, false));
-    }
-    QVERIFY(!sender.isConnected());
-    // What came is whole frames, then at most a part of one and the end.
-    const QByteArray received = peer.readAll();
-    for (qsizetype at = 0; at + 20480 <= received.size(); at += 20480) {
-        QCOMPARE(TestSocket::longAt(received, at + 16), static_cast<qint64>(at / 20480));
-    }
 }
 
 void TestTransport::senderSurvivesABlockedPeer()
