@@ -1,5 +1,6 @@
 #include "app/EditTitlerController.h"
 
+#include "app/EarlyRequests.h"
 #include "app/TitlerToolFactory.h"
 
 #include <QThread>
@@ -50,8 +51,10 @@ void EditTitlerController::setFactory(TitlerToolFactory* factory)
     if (mConnected)
         return;
     mProxy = factory->createService<IFileManagerController>(SERVICE_ID);
-    if (mProxy)
-        mProxy->registerCallBack(this);
+    if (!mProxy)
+        return;
+    EarlyRequests::getInstance()->expectClientId(SERVICE_ID);
+    mProxy->registerCallBack(this);
 }
 
 void EditTitlerController::getClientID(int id)
@@ -60,6 +63,7 @@ void EditTitlerController::getClientID(int id)
     if (mProxy)
         mProxy->registerNotify({this, id});
     mConnected = true;
+    EarlyRequests::getInstance()->clientIdCame(SERVICE_ID);
 }
 
 void EditTitlerController::editFolderStartStatus(QString folder)

@@ -1,5 +1,6 @@
 #include "app/ShowMessageController.h"
 
+#include "app/EarlyRequests.h"
 #include "app/TitlerToolFactory.h"
 #include "support/LogManager.h"
 
@@ -47,8 +48,10 @@ void ShowMessageController::setFactory(TitlerToolFactory* factory)
         return;
     LOG_DEBUG_OPERATE(L"ShowMessageController", 200, L"ShowMessageController::setFactory");
     mProxy = factory->createService<IMessageCenter>(SERVICE_ID);
-    if (mProxy)
-        mProxy->registerCallBack(this);
+    if (!mProxy)
+        return;
+    EarlyRequests::getInstance()->expectClientId(SERVICE_ID);
+    mProxy->registerCallBack(this);
 }
 
 void ShowMessageController::setClientID(int id)
@@ -57,6 +60,7 @@ void ShowMessageController::setClientID(int id)
     if (mProxy)
         mProxy->registerNotify({this, id});
     mConnected = true;
+    EarlyRequests::getInstance()->clientIdCame(SERVICE_ID);
 }
 
 void ShowMessageController::postMessage(MessageDef::Message_ID id)

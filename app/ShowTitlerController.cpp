@@ -1,5 +1,6 @@
 #include "app/ShowTitlerController.h"
 
+#include "app/EarlyRequests.h"
 #include "app/TitlerToolFactory.h"
 #include "support/LogManager.h"
 
@@ -45,5 +46,7 @@ void ShowTitlerController::changeFolderStatus(SubCommonDefine::tagFOLDER_TYPE fo
 
 void ShowTitlerController::showTitler()
 {
-    Q_EMIT signalShowTitlerParameter({_titler_paramter::SUB_PANEL, {}});
+    EarlyRequests::getInstance()->carryOut([this] {
+        Q_EMIT signalShowTitlerParameter({_titler_paramter::SUB_PANEL, {}});
+    });
 }

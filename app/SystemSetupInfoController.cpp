@@ -1,5 +1,6 @@
 #include "app/SystemSetupInfoController.h"
 
+#include "app/EarlyRequests.h"
 #include "app/TitlerToolFactory.h"
 
 #include <mutex>
@@ -47,8 +48,10 @@ void SystemSetupInfoController::setFactory(TitlerToolFactory* factory)
     if (mConnected)
         return;
     mProxy = factory->createService<ISystemSetupManager>(SERVICE_ID);
-    if (mProxy)
-        mProxy->registerCallBack(this);
+    if (!mProxy)
+        return;
+    EarlyRequests::getInstance()->expectClientId(SERVICE_ID);
+    mProxy->registerCallBack(this);
 }
 
 void SystemSetupInfoController::getClientID(int id)
@@ -59,6 +62,7 @@ void SystemSetupInfoController::getClientID(int id)
     mConnected = true;
     getModuleInfo();
     getLanguageInfo();
+    EarlyRequests::getInstance()->clientIdCame(SERVICE_ID);
 }
 
 void SystemSetupInfoController::getInputLanguage()

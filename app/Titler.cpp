@@ -1,5 +1,6 @@
 #include "app/Titler.h"
 
+#include "app/EarlyRequests.h"
 #include "app/EditContextController.h"
 #include "app/ShowMessageController.h"
 
@@ -15,26 +16,30 @@ void Titler::registerCallBack(ITitlerCallBack* callBack)
 
 void Titler::showTitlerCreate(_CALL_TITLER_TYPE type)
 {
-    mEditContext->showTitlerCreate(type);
+    EarlyRequests::getInstance()->carryOut([this, type] { mEditContext->showTitlerCreate(type); });
 }
 
 void Titler::showTitlerEdit(_SHOW_TITLER_PARAMTER param)
 {
-    mEditContext->showTitlerEdit(param);
+    EarlyRequests::getInstance()->carryOut([this, param] { mEditContext->showTitlerEdit(param); });
 }
 
 void Titler::showDialogMaskWidget(bool show)
 {
-    if (show)
-        mShowMessage->showDialogOpacityWidget();
-    else
-        mShowMessage->hideDialogOpacityWidget();
+    EarlyRequests::getInstance()->carryOut([this, show] {
+        if (show)
+            mShowMessage->showDialogOpacityWidget();
+        else
+            mShowMessage->hideDialogOpacityWidget();
+    });
 }
 
 void Titler::showMessageMaskWidget(bool show)
 {
-    if (show)
-        mShowMessage->showMessageOpacityWidget();
-    else
-        mShowMessage->hideMessageOpacityWidget();
+    EarlyRequests::getInstance()->carryOut([this, show] {
+        if (show)
+            mShowMessage->showMessageOpacityWidget();
+        else
+            mShowMessage->hideMessageOpacityWidget();
+    });
 }

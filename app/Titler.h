@@ -1,5 +1,5 @@
 // The object behind the service that this program offers: hands each call of a sibling to the controller that
-// answers for it. GUI thread.
+// answers for it, those that show something through EarlyRequests. GUI thread.
 #pragma once
 
 #include "messaging/services/ITitler.h"

@@ -1,5 +1,6 @@
 #include "app/TitlerAPPEventFilterController.h"
 
+#include "app/EarlyRequests.h"
 #include "app/TitlerToolFactory.h"
 
 #include <mutex>
@@ -46,8 +47,10 @@ void TitlerAPPEventFilterController::initialize(TitlerToolFactory* factory)
     if (mConnected)
         return;
     mProxy = factory->createService<IAPPEventFilter>(SERVICE_ID);
-    if (mProxy)
-        mProxy->registerCallBack(this);
+    if (!mProxy)
+        return;
+    EarlyRequests::getInstance()->expectClientId(SERVICE_ID);
+    mProxy->registerCallBack(this);
 }
 
 void TitlerAPPEventFilterController::setClientID(int id)
@@ -56,6 +59,7 @@ void TitlerAPPEventFilterController::setClientID(int id)
     if (mProxy)
         mProxy->registerNotify({this, id});
     mConnected = true;
+    EarlyRequests::getInstance()->clientIdCame(SERVICE_ID);
 }
 
 void TitlerAPPEventFilterController::sendAPPEvent(APPEventDefine::LOCKTYPE type, bool on)

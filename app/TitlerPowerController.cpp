@@ -1,5 +1,6 @@
 #include "app/TitlerPowerController.h"
 
+#include "app/EarlyRequests.h"
 #include "app/TitlerToolFactory.h"
 #include "support/LogManager.h"
 
@@ -49,8 +50,10 @@ void TitlerPowerController::setFactory(TitlerToolFactory* factory)
     if (mConnected)
         return;
     mProxy = factory->createService<IPowerManager>(SERVICE_ID);
-    if (mProxy)
-        mProxy->registerCallBack(this);
+    if (!mProxy)
+        return;
+    EarlyRequests::getInstance()->expectClientId(SERVICE_ID);
+    mProxy->registerCallBack(this);
 }
 
 void TitlerPowerController::getClientID(int id)
@@ -59,6 +62,7 @@ void TitlerPowerController::getClientID(int id)
     if (mProxy)
         mProxy->registerNotify({this, id});
     mConnected = true;
+    EarlyRequests::getInstance()->clientIdCame(SERVICE_ID);
 }
 
 void TitlerPowerController::powerOff()

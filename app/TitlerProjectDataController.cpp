@@ -1,5 +1,6 @@
 #include "app/TitlerProjectDataController.h"
 
+#include "app/EarlyRequests.h"
 #include "app/SystemSetupInfoController.h"
 #include "app/TitlerToolFactory.h"
 
@@ -44,8 +45,10 @@ void TitlerProjectDataController::setFactory(TitlerToolFactory* factory)
     if (mConnected)
         return;
     mProxy = factory->createService<IProjectDataManager>(SERVICE_ID);
-    if (mProxy)
-        mProxy->registerCallBack(this);
+    if (!mProxy)
+        return;
+    EarlyRequests::getInstance()->expectClientId(SERVICE_ID);
+    mProxy->registerCallBack(this);
 }
 
 void TitlerProjectDataController::getClientID(int id)
@@ -54,6 +57,7 @@ void TitlerProjectDataController::getClientID(int id)
     if (mProxy)
         mProxy->registerNotifyCallBack({this, id});
     mConnected = true;
+    EarlyRequests::getInstance()->clientIdCame(SERVICE_ID);
 }
 
 void TitlerProjectDataController::loadNotify(int state)

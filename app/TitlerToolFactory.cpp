@@ -1,5 +1,6 @@
 #include "app/TitlerToolFactory.h"
 
+#include "app/SiblingWait.h"
 #include "app/Titler.h"
 #include "messaging/ptc/CSimpleBuffer.h"
 #include "messaging/ptc/Proxy.h"
@@ -10,15 +11,18 @@
 #include "messaging/services/ServiceTable.h"
 #include "messaging/services/TitlerAdapter.h"
 #include "messaging/services/TitlerCallBackRemoteProxy.h"
+#include "support/LogManager.h"
 
-#include <unistd.h>
+#include <functional>
+#include <map>
+#include <string>
 
 namespace
 {
 
 constexpr long SOCKET_RECEIVER_ID = 0;
 constexpr unsigned long MINIMUM_ALLOCATION_UNIT = 4;
-constexpr unsigned CONNECT_RETRY_MICROSECONDS = 20000;
+constexpr int LOG_NUMBER = 200;
 
 } // namespace
 
@@ -54,23 +58,39 @@ PTC::ISender* TitlerToolFactory::serviceSender(long client, long port)
     if (PTC::ISender* sender = findSender(client))
         return sender;
     auto sender = std::make_unique<SocketRemoteSender>(client);
-    while (!sender->initialize(port))
-        ::usleep(CONNECT_RETRY_MICROSECONDS);
+    if (!SiblingWait(missingSiblings()).waitFor(*sender, port))
+        return nullptr;
     PTC::ISender* added = sender.get();
     addSender(sender.release());
     return added;
+}
+
+// In the order of their keys backwards, which is that of the start: the sub panel comes first.
+std::vector<long> TitlerToolFactory::missingSiblings()
+{
+    std::map<long, long, std::greater<>> ports;
+    for (const ServiceTable::Service& service : ServiceTable::services()) {
+        if (!findSender(service.clientKey))
+            ports[service.clientKey] = service.port;
+    }
+    std::vector<long> missing;
+    for (const auto& [key, port] : ports)
+        missing.push_back(port);
+    return missing;
 }
 
 void TitlerToolFactory::createInstance(long id, void** out)
 {
     const ServiceTable::Service* service = ServiceTable::findByInterface(id);
     void* instance = nullptr;
-    PTC::Proxy* proxy = ServiceFamilies::createProxy(id, &instance);
-    if (!service || !proxy)
+    std::unique_ptr<PTC::Proxy> made(ServiceFamilies::createProxy(id, &instance));
+    PTC::ISender* sender = service && made ? serviceSender(service->clientKey, service->port) : nullptr;
+    if (!sender)
         return;
-    mProxies.emplace_back(proxy);
+    PTC::Proxy* proxy = made.get();
+    mProxies.push_back(std::move(made));
     proxy->setAdapterFactory(this);
-    proxy->setSender(serviceSender(service->clientKey, service->port));
+    proxy->setSender(sender);
     proxy->setReceiver(mReceiver);
     *out = instance;
 }
@@ -96,20 +116,37 @@ PTC::IProxyBase* TitlerToolFactory::createProxy(long type, long id, long client)
 {
     if (type != TITLER_CALLBACK_INTERFACE_ID)
         return nullptr;
-    const long key = ServiceTable::senderKeyOf(client);
-    PTC::ISender* sender = findSender(key);
+    PTC::ISender* sender = ServiceTable::isSibling(client) ? callBackSender(client) : nullptr;
     if (!sender) {
-        auto connecting = std::make_unique<SocketRemoteSender>(key);
-        if (!connecting->initialize(client))
-            return nullptr;
-        sender = connecting.get();
-        addSender(connecting.release());
-    } else if (auto* socket = dynamic_cast<SocketRemoteSender*>(sender); socket && !socket->isConnected()) {
-        // The process behind the key was started anew and asks for answers: the old connection is of no use.
-        if (!socket->initialize(client))
-            return nullptr;
+        reportRefusal(client);
+        return nullptr;
     }
+    mLastRefusedClient.reset();
     auto* proxy = new TitlerCallBackRemoteProxy(id);
     proxy->setSender(sender);
     return proxy;
+}
+
+// The process behind the key may have been started anew: then its old connection is of no use.
+PTC::ISender* TitlerToolFactory::callBackSender(long client)
+{
+    const long key = ServiceTable::senderKeyOf(client);
+    if (auto* sender = dynamic_cast<SocketRemoteSender*>(findSender(key)))
+        return sender->beginConnect(client) ? sender : nullptr;
+    auto sender = std::make_unique<SocketRemoteSender>(key);
+    if (!sender->beginConnect(client))
+        return nullptr;
+    addSender(sender.release());
+    return findSender(key);
+}
+
+// A peer that asks again and again gets one line.
+void TitlerToolFactory::reportRefusal(long client)
+{
+    if (mLastRefusedClient == client)
+        return;
+    mLastRefusedClient = client;
+    LOG_DEBUG_OPERATE(L"TitlerToolFactory", LOG_NUMBER,
+                      L"No result will go to client " + std::to_wstring(client) +
+                          L": it is unknown or does not listen");
 }

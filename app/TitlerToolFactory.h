@@ -6,7 +6,7 @@
 #pragma once
 
 #include <memory>
-#include <unordered_map>
+#include <optional>
 #include <vector>
 
 #include "messaging/ptc/InstanceFactory.h"
@@ -35,14 +35,16 @@ public:
     // request reaches this process.
     bool initialize() override;
 
-    // Writes the proxy of a service to *out; an unknown id leaves it untouched. Blocks, without limit, until
-    // the sibling accepts the connection.
+    // Writes the proxy of a service to *out; an unknown id leaves it untouched. The first of each sibling
+    // blocks, without limit, until it accepts the connection; a request to end the process leaves *out
+    // untouched.
     void createInstance(long id, void** out) override;
 
     // Takes over an implementation of ITitler in place of the own one; only for its id, and only the first.
     virtual void RegisterObject(long id, void* object);
 
     PTC::IAdapterBase* createAdapter(long type, PTC::IReceiver* receiver, void* target) override;
+    // Null for a client number that no sibling has, and when nobody listens there; does not wait.
     PTC::IProxyBase* createProxy(long type, long id, long client) override;
 
     // createInstance with the interface's type: createInstance hands out the interface pointer as void*.
@@ -56,10 +58,14 @@ public:
 
 private:
     PTC::ISender* serviceSender(long client, long port);
+    std::vector<long> missingSiblings();
+    PTC::ISender* callBackSender(long client);
+    void reportRefusal(long client);
 
     std::unique_ptr<ITitler> mTitler;
     PTC::QtReceiver* mReceiver = nullptr;              // owned by the remote receiver, which listens
     std::unique_ptr<PTC::QtReceiver> mUnboundReceiver; // owns it instead when nothing listens
     std::vector<std::unique_ptr<PTC::IObject>> mProxies;
     long mNextAdapterId = 0;
+    std::optional<long> mLastRefusedClient;
 };

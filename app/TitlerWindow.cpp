@@ -3,6 +3,7 @@
 #include "app/TitlerWindow.h"
 
 #include "app/APPEventFilter.h"
+#include "app/EarlyRequests.h"
 #include "app/EditContextController.h"
 #include "app/EditTitlerController.h"
 #include "app/ShowMessageController.h"
@@ -133,6 +134,7 @@ TitlerWindow::~TitlerWindow()
     delete mGraphicsView;
     delete mCanvasScene;
 
+    EarlyRequests::clearInstance();
     ShowTitlerController::clearInstance();
     SystemSetupInfoController::clearInstance();
     ShowMessageController::clearInstance();

@@ -52,6 +52,7 @@ std::string g_strProcessName;
 std::atomic<bool> g_bIsInited{false};
 std::atomic<const char**> g_SignalMsgTable{nullptr};
 std::atomic<int> g_wakeUpWriteEnd{-1};
+std::atomic<bool> g_isTerminationRequested{false};
 
 // The table lies in pages of its own: the fault handler frees it, and the heap may be what is broken there.
 const char** allocateTable()
@@ -105,6 +106,7 @@ void createWakeUpPipe()
 
 void requestTermination()
 {
+    g_isTerminationRequested.store(true);
     const int writeEnd = g_wakeUpWriteEnd.load();
     if (writeEnd == -1) {
         callBack();
@@ -198,6 +200,11 @@ void registerSystemSignalHandler(void (*callback)(), char const* processName)
         sigaction(entry->number, &action, nullptr);
     }
     g_bIsInited.store(true);
+}
+
+bool isTerminationRequested()
+{
+    return g_isTerminationRequested.load();
 }
 
 void handleSignal(int signalNumber)

@@ -9,5 +9,8 @@
 // the GUI thread.
 void registerSystemSignalHandler(void (*callback)(), char const* processName);
 
+// Whether SIGTERM or SIGINT has come, for waits that hold the event loop up. Any thread.
+bool isTerminationRequested();
+
 // The handler itself.
 void handleSignal(int signalNumber);

@@ -10,7 +10,7 @@ class ITitler
 public:
     virtual ~ITitler() = default;
 
-    // Where results go. Null when the peer cannot be reached; otherwise the callback is handed over.
+    // Where results go from now on; the callback is handed over.
     virtual void registerCallBack(ITitlerCallBack* callBack) = 0;
     virtual void showTitlerCreate(_CALL_TITLER_TYPE type) = 0;
     virtual void showTitlerEdit(_SHOW_TITLER_PARAMTER param) = 0;

@@ -56,6 +56,14 @@ const std::array SERVICES = {
 };
 // clang-format on
 
+// By client number, from MAIN_CLIENT on.
+constexpr std::array<long, 9> SENDER_KEYS = {1, 2, 3, 4, 5, 6, 4, 7, 8};
+
+bool isClient(long client)
+{
+    return client >= MAIN_CLIENT && client - MAIN_CLIENT < static_cast<long>(SENDER_KEYS.size());
+}
+
 } // namespace
 
 std::span<const Service> services()
@@ -82,10 +90,12 @@ const Service* findByAdapter(long adapterType)
 
 long senderKeyOf(long client)
 {
-    const std::array<long, 9> keys = {1, 2, 3, 4, 5, 6, 4, 7, 8};
-    const long index = client - MAIN_CLIENT;
-    const bool known = index >= 0 && index < static_cast<long>(keys.size());
-    return known ? keys[static_cast<std::size_t>(index)] : TITLER_CLIENT_KEY;
+    return isClient(client) ? SENDER_KEYS[static_cast<std::size_t>(client - MAIN_CLIENT)] : TITLER_CLIENT_KEY;
+}
+
+bool isSibling(long client)
+{
+    return isClient(client) && client != TITLER_CLIENT;
 }
 
 } // namespace ServiceTable

@@ -34,7 +34,9 @@ std::span<const Service> services();
 const Service* findByInterface(long interfaceId);
 // The service that has the callback or notify adapter type; null for an unknown type.
 const Service* findByAdapter(long adapterType);
-// Key of the sender to a process by its client number.
+// Key of the sender to a process by its client number; that of this process for an unknown one.
 long senderKeyOf(long client);
+// Whether another process of the appliance has that client number.
+bool isSibling(long client);
 
 } // namespace ServiceTable

@@ -76,8 +76,9 @@ void TitlerAdapter::receiveRegisterCallBack(PTC::Event* event)
     std::unique_ptr<PTC::IProxyBase> proxy(
         createProxy(CALLBACK_INTERFACE_ID, info.adapterId, info.receiverIdentity));
     auto* callBack = dynamic_cast<ITitlerCallBack*>(proxy.get());
-    if (callBack != nullptr) {
-        static_cast<void>(proxy.release()); // the target's from here on
+    if (callBack == nullptr) {
+        return; // whoever registered before keeps the result
     }
+    static_cast<void>(proxy.release()); // the target's from here on
     m_target->registerCallBack(callBack);
 }

@@ -1,5 +1,6 @@
 // The controllers against siblings that record: hand-shake, requests, notices and their filters.
 #include "Siblings.h"
+#include "app/EarlyRequests.h"
 #include "app/EditTitlerController.h"
 #include "app/ShowMessageController.h"
 #include "app/ShowTitlerController.h"
@@ -62,6 +63,7 @@ private Q_SLOTS:
     void messageCarriesItsNumberAndText();
     void messagesWithoutServiceAreLost();
     void onTopFollowsTheService();
+    void requestsWaitForTheLastClientId();
     void showTitlerIsMode1();
 
 private:
@@ -111,6 +113,7 @@ void tst_controllers::cleanupTestCase()
     TitlerProjectDataController::clearInstance();
     TitlerAPPEventFilterController::clearInstance();
     EditTitlerController::clearInstance();
+    EarlyRequests::clearInstance();
     // Each took its leave of the service.
     QTRY_COMPARE(mSiblings.methodsOf(FILE_MANAGER), Methods({33, 34}));
     mFactory.reset();
@@ -125,6 +128,8 @@ void tst_controllers::factoryKnowsOnlyItsServices()
     QVERIFY(!mFactory->createAdapter(4711, nullptr, nullptr));
     QVERIFY(!mFactory->createProxy(117, 1, 1000));
     QVERIFY(!mFactory->createProxy(118, 1, 1005)); // nobody listens there
+    for (const long stranger : {0L, -1L, 1L, 999L, 1003L, 1009L, 64000L, 1L << 40})
+        QVERIFY(!mFactory->createProxy(118, 1, stranger));
     std::unique_ptr<PTC::IProxyBase> proxy(mFactory->createProxy(118, 77, 1000));
     QVERIFY(proxy);
     QCOMPARE(proxy->getId(), 77L);
@@ -378,6 +383,16 @@ void tst_controllers::onTopFollowsTheService()
     QTRY_COMPARE(mSiblings.methodsOf(MESSAGE_CENTER), Methods{1});
     QCOMPARE(mSiblings.lastArguments(MESSAGE_CENTER, 1), QByteArray("\x0c\x02"));
     QVERIFY(messages->getMapData().isEmpty());
+}
+
+// The power service of this test never gives one.
+void tst_controllers::requestsWaitForTheLastClientId()
+{
+    QSignalSpy spy(ShowTitlerController::getInstance(), &ShowTitlerController::signalShowTitlerParameter);
+    ShowTitlerController::getInstance()->showTitler();
+    QCOMPARE(spy.size(), 0);
+    EarlyRequests::getInstance()->clientIdCame(POWER_MANAGER);
+    QTRY_COMPARE(spy.size(), 1);
 }
 
 void tst_controllers::showTitlerIsMode1()

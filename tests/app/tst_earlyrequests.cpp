@@ -1,0 +1,118 @@
+// Requests that come before the hand-shakes are through.
+#include "app/EarlyRequests.h"
+
+#include <QEventLoop>
+#include <QTest>
+
+class tst_EarlyRequests : public QObject
+{
+    Q_OBJECT
+
+private Q_SLOTS:
+    void cleanup();
+    void atOnceWithoutHandShakes();
+    void afterTheLastHandShakeInTheirOrder();
+    void whatComesMeanwhileStaysBehind();
+    void aDialogHoldsNoOtherUp();
+    void aSilentServiceHoldsNothingUpForEver();
+    void aFloodIsCutOff();
+    void unknownHandShakes();
+
+private:
+    static EarlyRequests& requests() { return *EarlyRequests::getInstance(); }
+    void ask(int number)
+    {
+        requests().carryOut([this, number] { mDone << number; });
+    }
+
+    QList<int> mDone;
+};
+
+void tst_EarlyRequests::cleanup()
+{
+    EarlyRequests::clearInstance();
+    mDone.clear();
+}
+
+void tst_EarlyRequests::atOnceWithoutHandShakes()
+{
+    ask(1);
+    QCOMPARE(mDone, QList{1});
+}
+
+void tst_EarlyRequests::afterTheLastHandShakeInTheirOrder()
+{
+    requests().expectClientId(65);
+    requests().expectClientId(36);
+    ask(1);
+    requests().clientIdCame(65);
+    ask(2);
+    QCoreApplication::processEvents();
+    QVERIFY(mDone.isEmpty());
+    requests().clientIdCame(36);
+    QTRY_COMPARE(mDone, QList({1, 2}));
+    ask(3);
+    QCOMPARE(mDone, QList({1, 2, 3}));
+}
+
+void tst_EarlyRequests::whatComesMeanwhileStaysBehind()
+{
+    requests().expectClientId(65);
+    ask(1);
+    ask(2);
+    requests().clientIdCame(65);
+    ask(3);
+    QTRY_COMPARE(mDone, QList({1, 2, 3}));
+}
+
+void tst_EarlyRequests::aDialogHoldsNoOtherUp()
+{
+    requests().expectClientId(65);
+    QEventLoop dialog;
+    requests().carryOut([this, &dialog] {
+        mDone << 1;
+        dialog.exec();
+        mDone << 4;
+    });
+    ask(2);
+    requests().carryOut([this, &dialog] {
+        mDone << 3;
+        dialog.quit();
+    });
+    requests().clientIdCame(65);
+    QTRY_COMPARE(mDone, QList({1, 2, 3, 4}));
+}
+
+void tst_EarlyRequests::aSilentServiceHoldsNothingUpForEver()
+{
+    requests().expectClientId(71);
+    ask(1);
+    QTRY_COMPARE_WITH_TIMEOUT(mDone, QList{1}, 12 * EarlyRequests::PATIENCE.count() * 1000);
+    ask(2);
+    QCOMPARE(mDone, QList({1, 2}));
+}
+
+void tst_EarlyRequests::aFloodIsCutOff()
+{
+    requests().expectClientId(65);
+    for (int i = 0; i < 10 * EarlyRequests::MAX_KEPT; ++i)
+        ask(i);
+    requests().clientIdCame(65);
+    QTRY_COMPARE(mDone.size(), EarlyRequests::MAX_KEPT);
+    QCOMPARE(mDone.last(), EarlyRequests::MAX_KEPT - 1);
+}
+
+void tst_EarlyRequests::unknownHandShakes()
+{
+    requests().clientIdCame(65);
+    requests().expectClientId(65);
+    requests().expectClientId(65);
+    requests().clientIdCame(36);
+    ask(1);
+    QVERIFY(mDone.isEmpty());
+    requests().clientIdCame(65);
+    QTRY_COMPARE(mDone, QList{1});
+}
+
+QTEST_GUILESS_MAIN(tst_EarlyRequests)
+#include "tst_earlyrequests.moc"
