@@ -1,5 +1,7 @@
 #include "app/APPEventFilter.h"
 #include "app/TitlerWindow.h"
+#include "support/DataPathCheck.h"
+#include "support/DescriptorLimit.h"
 #include "support/FileSyncQueue.h"
 #include "support/FolderLookup.h"
 #include "support/IPathManagerEx.h"
@@ -12,7 +14,9 @@
 #include <QPixmapCache>
 #include <QStringList>
 #include <chrono>
+#include <cstdio>
 #include <malloc.h>
+#include <string>
 
 namespace
 {
@@ -57,6 +61,12 @@ void sweepSettings()
 int main(int argc, char* argv[])
 {
     OwnerOnlyFiles::setUmask();
+    const std::string problem = DataPathCheck::problem();
+    if (!problem.empty()) {
+        std::fprintf(stderr, "titler: %s\n", problem.c_str());
+        return DataPathCheck::EXIT_CODE;
+    }
+    DescriptorLimit::raise();
     keepMemoryFlat();
     KSInputContext::install();
     QApplication application(argc, argv);

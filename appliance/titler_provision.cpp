@@ -1,12 +1,16 @@
 // titler_provision: fills the data path of the environment with what a titler needs and some sample titles.
-// Prints the base path that it filled. Ends 1 when something could not be written.
+// Prints the base path that it filled. Ends 1 when something could not be written, 2 when the data path
+// cannot be worked with.
 
 #include "appliance/TitlerProvision.h"
+#include "support/DataPathCheck.h"
 #include "support/OwnerOnlyFiles.h"
 
 #include <QApplication>
 #include <QFontInfo>
 #include <QTextStream>
+
+#include <string>
 
 int main(int argc, char* argv[])
 {
@@ -17,11 +21,12 @@ int main(int argc, char* argv[])
     QTextStream out(stdout);
     QTextStream err(stderr);
 
-    const QString base = TitlerProvision::basePathOfEnvironment();
-    if (base.isEmpty()) {
-        err << "titler_provision: no data path\n";
-        return 1;
+    const std::string problem = DataPathCheck::problem();
+    if (!problem.empty()) {
+        err << "titler_provision: " << QString::fromStdString(problem) << "\n";
+        return DataPathCheck::EXIT_CODE;
     }
+    const QString base = TitlerProvision::basePathOfEnvironment();
     if (QFontInfo(QFont(QStringLiteral("KST"))).family() != QStringLiteral("KST")) {
         err << "titler_provision: the fonts of the build are not in use (FONTCONFIG_FILE)\n";
     }

@@ -66,18 +66,6 @@ std::string homeFolder()
     return "/";
 }
 
-std::string absolute(const std::string& path)
-{
-    if (!path.empty() && path.front() == '/') {
-        return path;
-    }
-    char folder[PATH_MAX];
-    if (getcwd(folder, sizeof folder) == nullptr) {
-        return "/" + path;
-    }
-    return std::string(folder) + "/" + path;
-}
-
 std::string parentOf(const std::string& path)
 {
     const auto slash = path.rfind('/');
@@ -194,7 +182,7 @@ int k2sys_getenv_ac_data(char* buffer, size_t size)
         const std::string base = environment("XDG_DATA_HOME");
         data = (base.empty() ? homeFolder() + "/.local/share" : base) + "/titler";
     }
-    return writePath(absolute(data), buffer, size, 1);
+    return writePath(data, buffer, size, 1);
 }
 
 int k2sys_getenv_ac_prefix(char* buffer, size_t size)

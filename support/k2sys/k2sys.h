@@ -36,7 +36,8 @@ K2SYS_API void k2sys_print_backtrace(void);
  * negative value, with an empty string where there is room for one, when the path does not fit.
  *
  * root: K2SYS_AC_ROOT, else empty. 1 when it is exactly "/", else 2.
- * data: K2SYS_AC_DATA, else $XDG_DATA_HOME/titler, else $HOME/.local/share/titler; absolute. 1.
+ * data: K2SYS_AC_DATA, else $XDG_DATA_HOME/titler, else $HOME/.local/share/titler; as it stands
+ * there, also when it is relative. 1.
  * prefix: K2SYS_AC_PREFIX, else the parent of the folder that the program was started from. 1.
  */
 K2SYS_API int k2sys_getenv_ac_root(char* buffer, size_t size);

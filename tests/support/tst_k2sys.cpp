@@ -4,7 +4,6 @@
 
 #include <QByteArray>
 #include <QCoreApplication>
-#include <QDir>
 #include <QTemporaryDir>
 #include <QTest>
 
@@ -65,7 +64,7 @@ void TestK2sys::data()
     QCOMPARE(buffer, "/own");
     qputenv("K2SYS_AC_DATA", "relative");
     QVERIFY(k2sys_getenv_ac_data(buffer, sizeof buffer) > 0);
-    QCOMPARE(QString::fromUtf8(buffer), QDir::currentPath() + "/relative");
+    QCOMPARE(buffer, "relative"); // for the program to refuse
 }
 
 void TestK2sys::prefix()
