@@ -8,6 +8,7 @@
 #include <QPointingDevice>
 #include <QTouchEvent>
 #include <QWidget>
+#include <utility>
 
 OneFinger::OneFinger(QWidget* widget) : m_widget(widget)
 {
@@ -69,6 +70,7 @@ OneFinger::Step OneFinger::begin(const QTouchEvent* event, QObject* receiver)
         }
         drop();
     }
+    reportEnd();
     const QEventPoint& point = event->points().constFirst();
     m_id = point.id();
     m_receiver = receiver;
@@ -139,10 +141,20 @@ void OneFinger::drop()
     Q_EMIT cancelled();
 }
 
-void OneFinger::receiverDestroyed()
+// What is left of the receiver is not fit to be put back by the widget.
+void OneFinger::receiverDestroyed(QObject* receiver)
 {
-    if (isDown() && m_receiver == nullptr) {
-        drop();
+    if (isDown() && (m_receiver == nullptr || m_receiver == receiver)) {
+        letGo();
+        m_isEndUnreported = true;
+        QMetaObject::invokeMethod(this, &OneFinger::reportEnd, Qt::QueuedConnection);
+    }
+}
+
+void OneFinger::reportEnd()
+{
+    if (std::exchange(m_isEndUnreported, false)) {
+        Q_EMIT cancelled();
     }
 }
 

@@ -63,7 +63,8 @@ public:
     bool eventFilter(QObject* object, QEvent* event) override;
 
 Q_SIGNALS:
-    // The touch ended without a lift; isDown() is false already.
+    // The touch ended without a lift; isDown() is false already. When the object that received the touch is
+    // destroyed, this comes once it is gone.
     void cancelled();
     void held();
 
@@ -75,12 +76,14 @@ private:
     bool isLost(const QObject* receiver) const;
     void letGo();
     void drop();
-    void receiverDestroyed();
+    void receiverDestroyed(QObject* receiver);
+    void reportEnd();
 
     QWidget* m_widget;
     QPointer<QObject> m_receiver;
     int m_id = NONE;
     Step m_step = Step::None;
+    bool m_isEndUnreported = false;
     QPointF m_position;
     QPointF m_pressPosition;
     TouchTimer m_hold;

@@ -6,6 +6,7 @@
 #include <QPointer>
 #include <QStringList>
 #include <QWidget>
+#include <private/qmetaobject_p.h>
 #include <private/qobject_p.h>
 #include <utility>
 
