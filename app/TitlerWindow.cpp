@@ -6,6 +6,7 @@
 #include "app/EarlyRequests.h"
 #include "app/EditContextController.h"
 #include "app/EditTitlerController.h"
+#include "app/SavingNotice.h"
 #include "app/ShowMessageController.h"
 #include "app/ShowTitlerController.h"
 #include "app/SystemSetupInfoController.h"
@@ -283,6 +284,7 @@ void TitlerWindow::initChildWindows()
     mOpacityMask->setGeometry(rect());
     mOpacityMask->raise();
     mOpacityMask->hide();
+    mSavingNotice = new SavingNotice(this);
     mFolderPicker = new FolderPicker(this);
     mTemplatePicker = new TemplatePicker(this);
 }

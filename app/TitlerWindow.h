@@ -36,6 +36,7 @@ class QLabel;
 class QPushButton;
 class QTranslator;
 class QUndoCommand;
+class SavingNotice;
 class ShowMessageController;
 class ShowTitlerController;
 class SystemSetupInfoController;
@@ -73,6 +74,7 @@ public:
 
     // Puts what is being edited on its way to disk, as leaving the title does.
     void saveCurrentTitle();
+    // Blocks, and says so on the window, until all pictures are in their place. Gives up when the disk hangs.
     void waitUntilSaved();
 
     bool archiveListIsMoveMode() const;
@@ -191,6 +193,10 @@ private:
     void sendTransientControlEvent(bool on);
     void reportHiddenControl();
 
+    bool asksAboutUnsavedWork();
+    void giveUpUnsavedWork();
+    void logUnsynced();
+
     void setOpacityMaskVisible(bool visible);
     void showDialogMaskWidget(bool show);
     void showMessageMaskWidget(bool show);
@@ -203,6 +209,9 @@ private:
     void changeFontComboxItem(SystemSetupDef::emInformationModel moduleInfo);
     void drawCanvasSceneBG(QPainter& painter);
     void resetCanvasBackground();
+
+    // What the operator is being asked about the end of the session.
+    enum class Question { None, LoseUnsavedWork };
 
     static bool WINDOW_IS_SHOWN;
 
@@ -217,6 +226,7 @@ private:
     KSPushbutton* mMoveButton = nullptr;
     QUndoStack mUndoStack;
     QWidget* mOpacityMask = nullptr;
+    SavingNotice* mSavingNotice = nullptr;
     FolderPicker* mFolderPicker = nullptr;
     TemplatePicker* mTemplatePicker = nullptr;
     QWidget* mMessageMask = nullptr;
@@ -241,6 +251,7 @@ private:
     QPixmap mWindowPanelPixmap;
     QPixmap mCanvasPixmap;
 
+    Question mQuestion = Question::None;
     bool m_bDeferArchiveList;
     bool m_bRealClose = true;
     bool m_bFolderDialogFromWindow = false;

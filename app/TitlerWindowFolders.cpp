@@ -19,6 +19,7 @@ void TitlerWindow::connectForFolderPicker()
             &ArchiveList::refreshArchiveListInFile);
     connect(mFolderPicker, &FolderPicker::folderNameChange, mArchiveList,
             &ArchiveList::refreshArchiveListForChangeFolderName);
+    connect(mFolderPicker, &FolderPicker::folderMoved, mCanvasScene, &CanvasScene::folderRenamed);
 }
 
 void TitlerWindow::connectForFolderNotices()

@@ -3,31 +3,42 @@
 
 #include "app/EditContextController.h"
 #include "app/EditTitlerController.h"
+#include "app/LossDescription.h"
+#include "app/SavingNotice.h"
 #include "app/ShowMessageController.h"
 #include "app/SystemSetupInfoController.h"
 #include "app/ToolsBar.h"
 #include "canvas/CanvasScene.h"
 #include "canvas/GraphicsView.h"
+#include "canvas/SaveOutage.h"
 #include "library/ArchiveList.h"
 #include "library/FolderPicker.h"
 #include "library/TemplatePicker.h"
 #include "panel/TextToolsPanel.h"
 #include "support/ConfinedPath.h"
+#include "support/FileSyncQueue.h"
 #include "support/IPathManagerEx.h"
 #include "support/LogManager.h"
+#include "support/RefusedWrites.h"
 #include "touchui/KSInputContext.h"
 
 #include <QAction>
 #include <QApplication>
 #include <QCloseEvent>
 #include <QFileInfo>
+#include <QTimer>
 #include <QUndoCommand>
-#include <unistd.h>
+#include <algorithm>
+#include <string>
+#include <utility>
+#include <vector>
 
 namespace
 {
 
-constexpr unsigned SAVE_POLL_SECONDS = 1;
+constexpr int SYNC_DEADLINE = 10000; // ms
+constexpr std::size_t MOST_LOGGED = 20;
+constexpr int LOG_NUMBER = 400;
 constexpr int FOCUS_COMMAND_ID = 1;
 constexpr int CANVAS_CHECKER = 2;
 
@@ -36,12 +47,19 @@ bool isBelowTitles(const QString& path)
     return ConfinedPath::isBelow(&IPathManagerEx::getTitleResourcesPath, path.toStdString());
 }
 
+void logPath(const char* what, const std::string& path)
+{
+    LOG_DEBUG_OPERATE(L"TitlerWindow", LOG_NUMBER,
+                      (QString::fromLatin1(what) + QString::fromStdString(path)).toStdWString());
+}
+
 } // namespace
 
 void TitlerWindow::showTitlerWindow(titler_paramter paramter)
 {
     if (!isHidden())
         return;
+    mQuestion = Question::None;
     show();
     activateWindow();
     raise();
@@ -122,6 +140,8 @@ void TitlerWindow::closeTitlerWindow()
     mToolsBar->resetToDefaultState();
     resetCanvasBackground();
     waitUntilSaved();
+    if (asksAboutUnsavedWork())
+        return;
 
     if (m_bEditByMain && EditContextController::getInstance()->isMainNeedMsg()) {
         if (mShowMessageController)
@@ -160,12 +180,59 @@ void TitlerWindow::closeTitlerMainWindow()
     EditContextController::getInstance()->setITitlerNoCallBack();
     if (mShowMessageController)
         mShowMessageController->changeTopWindow(MessageDefine::TOP_WINDOW_MAIN);
+    // All files are in their place; the disk may take longer, but nobody waits for it.
+    QTimer::singleShot(SYNC_DEADLINE, this, &TitlerWindow::logUnsynced);
+}
+
+// Whether work is in memory only: then the operator is asked, and the answer goes on from here.
+bool TitlerWindow::asksAboutUnsavedWork()
+{
+    mQuestion = Question::None;
+    for (const RefusedWrites::File& file : RefusedWrites::forgetVanished())
+        logPath("gone with its folder: ", file.path);
+    if (SaveOutage::instance()->retry() || !mShowMessageController)
+        return false;
+    mQuestion = Question::LoseUnsavedWork;
+    mShowMessageController->postMessage(MessageDef::MESSAGE_CONFIRM_CLOSE,
+                                        LossDescription::of(RefusedWrites::files()));
+    return true;
+}
+
+void TitlerWindow::giveUpUnsavedWork()
+{
+    if (SaveOutage::instance()->retry())
+        return;
+    for (const RefusedWrites::File& file : RefusedWrites::files()) {
+        logPath("lost, not saved: ", file.path);
+        RefusedWrites::forget(file.path);
+    }
+    SaveOutage::instance()->retry(); // which ends it
+}
+
+void TitlerWindow::logUnsynced()
+{
+    const std::vector<std::string> paths = FileSyncQueue::unsynced();
+    for (std::size_t i = 0; i < std::min(paths.size(), MOST_LOGGED); ++i)
+        logPath("not yet on the disk: ", paths[i]);
+    if (paths.size() > MOST_LOGGED)
+        logPath("not yet on the disk, more files: ", std::to_string(paths.size() - MOST_LOGGED));
 }
 
 void TitlerWindow::continueCloseTitler(MessageDefine::tagCloseParam param)
 {
-    if (!isHidden() && param.messageId == MessageDef::MESSAGE_CONFIRM_CLOSE)
-        closeTitlerMainWindow();
+    if (isHidden() || param.messageId != MessageDef::MESSAGE_CONFIRM_CLOSE)
+        return;
+    if (std::exchange(mQuestion, Question::None) == Question::LoseUnsavedWork) {
+        if (param.closeType != MessageDefine::CLOSE_OK) {
+            // The session goes on; the folder was already given free.
+            const QString path = mArchiveList->getCurrentPath();
+            if (!path.isEmpty() && mEditTitlerController)
+                mEditTitlerController->editFolderStartStatus(path);
+            return;
+        }
+        giveUpUnsavedWork();
+    }
+    closeTitlerMainWindow();
 }
 
 void TitlerWindow::setRealClose(bool realClose)
@@ -180,8 +247,13 @@ bool TitlerWindow::dataSaveIsFinished()
 
 void TitlerWindow::waitUntilSaved()
 {
-    while (!dataSaveIsFinished())
-        ::sleep(SAVE_POLL_SECONDS);
+    if (!dataSaveIsFinished()) {
+        if (isVisible())
+            mSavingNotice->showAtOnce();
+        if (!mCanvasScene->waitForPictures())
+            logPath("pictures are still being written", {});
+        mSavingNotice->hide();
+    }
     // The thread that writes the pictures reports them by way of this thread's events. Siblings hear of them
     // before they hear of what follows, and before the process is gone.
     if (mEditTitlerController)
@@ -207,6 +279,7 @@ void TitlerWindow::endProcess()
     mFolderPicker->done(QDialog::Rejected); // a dialog with no Cancel would refuse the end
     saveCurrentTitle();
     waitUntilSaved();
+    giveUpUnsavedWork();
     if (mInputContext && !KSInputContext::isSoftKeyboardClosed())
         mInputContext->simpleCloseSoftKeyBoardWindow(); // it would stay up without this process
     close();

@@ -6,6 +6,7 @@
 #include "support/FolderLookup.h"
 #include "support/IPathManagerEx.h"
 #include "support/LeftoverSweep.h"
+#include "support/LogManager.h"
 #include "support/OwnerOnlyFiles.h"
 #include "support/SystemSignalHandler.h"
 #include "touchui/KSInputContext.h"
@@ -24,6 +25,7 @@ namespace
 const QString RIGHT_OPTION = QStringLiteral("-right");
 constexpr int RIGHT_WINDOW_LEFT = 1280;
 constexpr std::chrono::seconds SYNC_DEADLINE(10);
+constexpr int LOG_NUMBER = 400;
 
 // Called in the GUI thread when the process is told to stop.
 void onSystemSingleCaught()
@@ -49,11 +51,21 @@ void keepMemoryFlat()
 void sweepSettings()
 {
     for (const FolderLookup::Getter getter :
-         {&IPathManagerEx::getSystemSettingPath, &IPathManagerEx::getTitlerTemplatesPath}) {
+         {&IPathManagerEx::getSystemSettingPath, &IPathManagerEx::getTitlerTemplatesPath,
+          &IPathManagerEx::getTemplatesPath}) {
         const std::string folder = FolderLookup::multiByte(getter);
         if (!folder.empty())
             LeftoverSweep::sweepWithChildren(folder);
     }
+}
+
+// The files are in their place; what becomes of them when the power goes now nobody knows.
+void logUnsynced()
+{
+    for (const std::string& path : FileSyncQueue::unsynced())
+        LOG_DEBUG_OPERATE(L"Titler", LOG_NUMBER,
+                          QStringLiteral("ends before this is on the disk: ").toStdWString() +
+                              QString::fromStdString(path).toStdWString());
 }
 
 } // namespace
@@ -89,9 +101,10 @@ int main(int argc, char* argv[])
 
     const int result = QApplication::exec();
 
+    if (!FileSyncQueue::flush(SYNC_DEADLINE))
+        logUnsynced();
     delete pMainWindow;
     pMainWindow = nullptr;
     APPEventFilter::release();
-    FileSyncQueue::flush(SYNC_DEADLINE);
     return result;
 }

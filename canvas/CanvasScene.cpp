@@ -9,6 +9,7 @@
 #include "canvas/MoveItemCommand.h"
 #include "canvas/NewTextStyle.h"
 #include "canvas/SafeAreaLines.h"
+#include "canvas/SaveOutage.h"
 #include "canvas/SoftKeyboardField.h"
 #include "canvas/StyleComparison.h"
 #include "canvas/TextObjectList.h"
@@ -56,6 +57,7 @@ CanvasScene::CanvasScene(std::unique_ptr<IThumbnailRender> render, QObject* pare
 {
     // A handful of items that change their size with every key: an index costs more than it saves.
     setItemIndexMethod(NoIndex);
+    SaveOutage::instance(); // from here on titles may be saved
     m_controller->getTextStyle(m_defaultFontStyle.get());
     m_newTextStyle = std::make_unique<NewTextStyle>(tr("Title goes here"), *m_defaultFontStyle);
     if (m_thumbnailRender) {
@@ -164,6 +166,8 @@ void CanvasScene::slotUpdateArchive(const Archive* archive)
     }
     m_topZ = int(m_texts->maxZValue());
     reportMissingFamily();
+    if (m_thumbnailRender && lacksPictures())
+        m_thumbnailRender->makeThumbnail(m_archive.get(), true);
     if (m_drawSafeArea)
         drawSafeAreaRect();
 }

@@ -58,6 +58,9 @@ public:
     void saveArchiveFlag() { m_thumbnailNeeded = true; }
     void createThumnailPicture();
     bool isEditFinish() const;
+    // Blocks until the pictures are written, or nothing has come of them for a long time: the disk hangs, and
+    // they are written when it goes on. Returns isEditFinish().
+    bool waitForPictures() const;
     // The operator goes away from the title shown: what is being edited is taken over, blank objects go, and
     // the pictures are made.
     void leaveTitle();
@@ -105,8 +108,8 @@ public:
     void generateThumbnail(QSize size, const QString& path);
     // The copy of the title shown, or null; owned by the scene.
     const Archive* archive() const;
-    // The folder of the title shown, if this is its path, lies elsewhere now: what is being typed is taken
-    // over, and all that is saved goes there.
+    // A folder lies elsewhere now: all that is still to be saved in it goes there. If it is that of the title
+    // shown, what is being typed is taken over.
     void folderRenamed(const QString& before, const QString& after);
 
 public Q_SLOTS:
@@ -173,7 +176,8 @@ private:
     void changeItemTextStyleAccordingToItemStatus(GraphicsText* item, TText* style, int id, int mode,
                                                   bool overall, int undoFlag);
     void pushDeleteCommand(GraphicsText* item);
-    void saveArchiveXML(const QString& path);
+    bool saveArchiveXML(const QString& path);
+    bool lacksPictures() const;
     void openKeyboardForItem(GraphicsText* item);
 
     QPointer<GraphicsText> m_currentItem;

@@ -19,6 +19,11 @@ public:
     virtual void makeThumbnail(const Archive* archive, bool bigSize) = 0;
     // True when no picture waits to be written.
     virtual bool makePictureThreadIsFinished() = 0;
+    // Titles whose pictures are not written yet: while they become fewer, waiting is worth it.
+    virtual int unfinishedTitles() { return makePictureThreadIsFinished() ? 0 : 1; }
+    // Titles of the folder lie in another one now, under the same names; so do the pictures still to be
+    // written. Both paths without a "/" at the end.
+    virtual void folderRenamed(const QString& /*before*/, const QString& /*after*/) {}
 
 Q_SIGNALS:
     // The list picture of the title at path is ready.

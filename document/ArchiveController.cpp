@@ -4,6 +4,7 @@
 #include "document/ArchiveManager.h"
 #include "document/ArchiveOrder.h"
 #include "document/DocumentConstants.h"
+#include "document/FolderOrder.h"
 #include "document/FolderTitles.h"
 #include "document/ITitleChangeReporter.h"
 #include "support/ConfinedPath.h"
@@ -12,8 +13,9 @@
 
 #include <algorithm>
 #include <memory>
-#include <stdexcept>
 #include <string_view>
+#include <sys/stat.h>
+#include <unordered_map>
 #include <unordered_set>
 
 namespace
@@ -66,6 +68,56 @@ int firstGap(std::vector<int> numbers)
     return 0;
 }
 
+// A source that is not there is none: titles lack pictures, and get them when they are opened.
+bool copyIfThere(const std::string& source, const std::string& target)
+{
+    struct stat status = {};
+    if (source.empty() || target.empty() || ::stat(source.c_str(), &status) != 0 || !S_ISREG(status.st_mode))
+        return true;
+    struct stat targetStatus = {};
+    if (::stat(target.c_str(), &targetStatus) == 0 && targetStatus.st_dev == status.st_dev &&
+        targetStatus.st_ino == status.st_ino)
+        return true; // the same file
+    return SystemInfo::copyFolderFile(source, target);
+}
+
+// Inserts the old rows that are not known, each behind the row that it stood behind. Returns whether there
+// were any.
+bool insertUnknownRows(const std::string& folder, const std::vector<ArchiveOrder>& oldRows,
+                       const std::unordered_set<std::string>& known, std::vector<ArchiveOrder>& rows)
+{
+    std::unordered_map<std::string, std::vector<ArchiveOrder>>
+        unknownBehind; // by the row before; "" at the top
+    std::string before;
+    std::unordered_set<std::string> listed;
+    for (const ArchiveOrder& row : rows)
+        listed.insert(row.getArchivePath());
+    for (const ArchiveOrder& row : oldRows) {
+        const std::string& name = row.getArchivePath();
+        struct stat status = {};
+        if (listed.contains(name))
+            before = name;
+        else if (!name.empty() && !known.contains(name) &&
+                 ::lstat((folder + STR_SLASH + name).c_str(), &status) == 0)
+            unknownBehind[before].push_back(row);
+    }
+    if (unknownBehind.empty())
+        return false;
+    std::vector<ArchiveOrder> merged = std::move(unknownBehind[std::string()]);
+    for (ArchiveOrder& row : rows) {
+        const std::string name = row.getArchivePath();
+        merged.push_back(std::move(row));
+        if (const auto unknown = unknownBehind.find(name); !name.empty() && unknown != unknownBehind.end()) {
+            merged.insert(merged.end(), unknown->second.begin(), unknown->second.end());
+            unknownBehind.erase(unknown);
+        }
+    }
+    for (std::size_t k = 0; k < merged.size(); ++k)
+        merged[k].setArchiveIndex(static_cast<int>(k));
+    rows = std::move(merged);
+    return true;
+}
+
 } // namespace
 
 ArchiveController::ArchiveController() : mArchiveManager(ArchiveManager::getInstance())
@@ -82,29 +134,15 @@ QList<std::string> ArchiveController::getFolderList()
 
 // Row by row, without those that are too short for the name of a title. The others must not be lost with
 // them: what the list does not show, the clean-up deletes.
-QList<Archive*> ArchiveController::readableArchives(const std::string& folder)
+QList<Archive*> ArchiveController::getArchiveList(QString folder)
 {
-    const FolderTitles rows(folder);
+    const FolderTitles rows(folder.toStdString(), FolderTitles::WithoutOrder::ByName);
     QList<Archive*> titles;
     for (std::unique_ptr<Archive>& title : rows.read(0, rows.count())) {
         if (title)
             titles.append(title.release());
     }
     return titles;
-}
-
-QList<Archive*> ArchiveController::getArchiveList(QString folder)
-{
-    if (folder.isEmpty())
-        return {};
-    const std::string path = folder.toStdString();
-    try {
-        const std::vector<Archive*> titles = mArchiveManager->getArchivesUnderFolder(path);
-        return QList<Archive*>(titles.begin(), titles.end());
-    } catch (const std::out_of_range&) {
-        logDebug(L"The order file names what cannot be a title: " + folder.toStdWString());
-        return readableArchives(path);
-    }
 }
 
 bool ArchiveController::getOneArchive(QString path, Archive* archive)
@@ -144,6 +182,37 @@ bool ArchiveController::saveArchiveListOrder(QString folder, QList<ArchiveOrder*
     return mArchiveManager->setArchivesSortUnderFolder(folder.toStdString(), std::move(copies)) == 1;
 }
 
+bool ArchiveController::prepareOrder(QString folder)
+{
+    const std::string path = folder.toStdString();
+    const FolderOrder::State state = FolderOrder::stateOf(path);
+    if (state == FolderOrder::State::Whole)
+        return !FolderOrder::isKept(path);
+    if (state == FolderOrder::State::Unreadable)
+        return false; // it may be good, and must not be written over
+    const std::vector<ArchiveOrder> rows =
+        FolderOrder::rowsByName(mArchiveManager->getFileListUnderFolder(path));
+    if (rows.empty())
+        return state == FolderOrder::State::Missing;
+    FolderOrder::writeOrKeep(path, rows);
+    return false;
+}
+
+bool ArchiveController::saveListedOrder(QString folder, QList<ArchiveOrder*> listed,
+                                        const std::unordered_set<std::string>& known)
+{
+    if (folder.isEmpty())
+        return false;
+    const std::string path = folder.toStdString();
+    const bool isWhole = FolderOrder::stateOf(path) == FolderOrder::State::Whole;
+    std::vector<ArchiveOrder> rows;
+    rows.reserve(static_cast<std::size_t>(listed.size()));
+    for (const ArchiveOrder* row : listed)
+        rows.push_back(*row);
+    const bool hasUnknown = insertUnknownRows(path, FolderOrder::rowsToShow(path), known, rows);
+    return FolderOrder::writeOrKeep(path, rows) && (isWhole || !hasUnknown);
+}
+
 std::vector<ArchiveOrder*> ArchiveController::getFileOrder(QString folder)
 {
     mFileOrder = mArchiveManager->getArchivesSortUnderFolder(folder.toStdString());
@@ -174,26 +243,27 @@ int ArchiveController::setLastFolderPath(QString path)
 
 int ArchiveController::copyArchiveBg(Archive* from, Archive* to)
 {
-    SystemInfo::copyFolderFile(from->getFullPathOfBgResource().toStdString(),
-                               to->getFullPathOfBgResource().toStdString());
-    SystemInfo::copyFolderFile(from->getFullPathOfBgResourceBig().toStdString(),
-                               to->getFullPathOfBgResourceBig().toStdString());
-    return 1;
+    const bool isCopied = copyIfThere(from->getFullPathOfBgResource().toStdString(),
+                                      to->getFullPathOfBgResource().toStdString());
+    const bool isBigCopied = copyIfThere(from->getFullPathOfBgResourceBig().toStdString(),
+                                         to->getFullPathOfBgResourceBig().toStdString());
+    return isCopied && isBigCopied ? 1 : 0;
 }
 
 int ArchiveController::copyArchiveThumbnail(Archive* from, Archive* to)
 {
+    bool isCopied = true;
     const auto copy = [&](std::string (Archive::*name)() const) {
         const std::string source = (from->*name)();
         const std::string target = (to->*name)();
         if (!source.empty() && !target.empty()) // an empty name would stand for the whole folder
-            SystemInfo::copyFolderFile(beside(*from, source), beside(*to, target));
+            isCopied = copyIfThere(beside(*from, source), beside(*to, target)) && isCopied;
     };
     copy(&Archive::getThumbnailBig);
     copy(&Archive::getThumbnailMiddle);
     copy(&Archive::getThumbnailBlack);
     copy(&Archive::getThumbnailSmall);
-    return 1;
+    return isCopied ? 1 : 0;
 }
 
 QString ArchiveController::getFreeNameInUserTemplate(QString folder)
@@ -223,12 +293,11 @@ bool ArchiveController::createNewOrderAccordingToFilesUnderFolder(QString folder
     const std::vector<std::string> files = mArchiveManager->getFileListUnderFolder(path);
     if (files.empty())
         return false;
-    const std::vector<ArchiveOrder*> rows = mArchiveManager->getArchivesSortUnderFolder(path);
-    const std::vector<std::unique_ptr<ArchiveOrder>> owner(rows.begin(), rows.end());
-    if (!rows.empty())
+    std::vector<ArchiveOrder> rows;
+    const FolderOrder::State state = FolderOrder::read(path, rows);
+    if (!rows.empty() || state == FolderOrder::State::Unreadable)
         return false;
-    mArchiveManager->setArchivesSortUnderFolder(path, ArchiveManager::orderRowsFor(files));
-    return true;
+    return FolderOrder::write(path, FolderOrder::rowsByName(files));
 }
 
 QList<std::string> ArchiveController::reCreateOrderXml()
@@ -247,12 +316,16 @@ void ArchiveController::deleteUnusefulArchives(QString folder)
     std::vector<std::string> victims = mArchiveManager->getFileListUnderFolder(path);
     if (victims.empty())
         return;
-    const std::vector<ArchiveOrder*> rows = mArchiveManager->getArchivesSortUnderFolder(path);
-    const std::vector<std::unique_ptr<ArchiveOrder>> owner(rows.begin(), rows.end());
+    std::vector<ArchiveOrder> rows;
+    if (FolderOrder::read(path, rows) != FolderOrder::State::Whole || FolderOrder::isKept(path))
+        return;
     if (!rows.empty()) {
         if (victims.size() - 1 == rows.size()) // one of the files is the order file
             return;
-        victims = getDeletedFileList(std::move(victims), getTargetFileList(rows, path));
+        std::vector<std::string> targets;
+        for (const ArchiveOrder& row : rows)
+            targets.push_back(path + STR_SLASH + row.getArchivePath());
+        victims = getDeletedFileList(std::move(victims), std::move(targets));
     }
     for (const std::string& victim : victims) {
         if (mArchiveManager->deleteArchive(victim) != 1) {

@@ -7,6 +7,7 @@
 #include <QString>
 #include <memory>
 #include <string>
+#include <unordered_set>
 #include <vector>
 
 class Archive;
@@ -24,7 +25,7 @@ public:
     // Full paths of the title folders.
     QList<std::string> getFolderList();
 
-    // The titles of a folder in its order. The caller owns them.
+    // The titles of a folder in its order, or by name where it has none. The caller owns them.
     QList<Archive*> getArchiveList(QString folder);
 
     // Reads one title into the record.
@@ -35,6 +36,19 @@ public:
     bool deleteArchive(QString path);
     bool saveArchiveListOrder(QString folder, QList<ArchiveOrder*> rows);
 
+    // Looks at the order of a folder that is being opened: where it is missing or torn, a new one is made of
+    // the names of its titles (what the disk refuses is kept). Returns whether the order can be trusted: it
+    // is whole, or there was nothing to put in order. Where it cannot, nothing may be removed because the
+    // order does not name it.
+    bool prepareOrder(QString folder);
+
+    // Saves the order of the titles that are listed. Rows of the old order for files that are in the folder
+    // but are not known, because they could not be read, keep their place. What the disk refuses is kept, too
+    // (RefusedWrites). Returns whether the order is on its way to the disk and can be trusted: where the old
+    // one could not be read there may have been titles that it did not name.
+    bool saveListedOrder(QString folder, QList<ArchiveOrder*> listed,
+                         const std::unordered_set<std::string>& known);
+
     // The rows of a folder's order file. They stay valid as long as this controller, however often it is
     // asked.
     std::vector<ArchiveOrder*> getFileOrder(QString folder);
@@ -44,7 +58,8 @@ public:
     QString getLastFolderPath();
     int setLastFolderPath(QString path);
 
-    // Copy pictures between the folders of two titles, from the names in one record to those in the other. 1.
+    // Copy pictures between the folders of two titles, from the names in one record to those in the other. 0
+    // when a file that is there could not be copied, else 1.
     int copyArchiveBg(Archive* from, Archive* to);
     int copyArchiveThumbnail(Archive* from, Archive* to);
 
@@ -58,7 +73,8 @@ public:
     QList<std::string> reCreateOrderXml();
 
     // Deletes the titles of a folder, with their pictures, that its order file does not name, and reports
-    // each. Looks at the names only when there are more or fewer files than rows.
+    // each. Looks at the names only when there are more or fewer files than rows. Does nothing without a
+    // whole order file, or with one that the disk has not taken yet.
     void deleteUnusefulArchives(QString folder);
 
     std::vector<std::string> getTargetFileList(std::vector<ArchiveOrder*> rows, std::string folder);
@@ -68,8 +84,6 @@ public:
                                                 std::vector<std::string> targets);
 
 private:
-    QList<Archive*> readableArchives(const std::string& folder);
-
     ArchiveManager* mArchiveManager;       // shared, not owned
     std::vector<ArchiveOrder*> mFileOrder; // the rows last fetched
     std::vector<std::unique_ptr<ArchiveOrder>> mFetchedRows;

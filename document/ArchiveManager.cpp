@@ -1,12 +1,13 @@
 #include "document/ArchiveManager.h"
 
 #include "document/Archive.h"
-#include "document/ArchiveOrder.h"
+#include "document/FolderOrder.h"
 #include "document/LastSettingParser.h"
 #include "document/TitleParser.h"
 #include "document/TitleParserUtility.h"
 #include "support/FolderLookup.h"
 #include "support/IPathManagerEx.h"
+#include "support/RefusedWrites.h"
 #include "support/Utf8.h"
 
 #include <QFileInfo>
@@ -144,15 +145,20 @@ int ArchiveManager::deleteArchive(std::string path)
     if (TitleParser().readOneTitle(path, &archive) < 1) // its place in the order does not matter
         return 0;
     const bool isRemoved = std::remove(path.c_str()) == 0;
+    if (!isRemoved)
+        return 0; // it keeps its pictures
+    RefusedWrites::forget(path);
     const std::string folder = path.substr(0, path.rfind('/') + 1);
     // Most titles lack some of these.
     for (const std::string& name :
          {archive.getThumbnailBig(), archive.getThumbnailSmall(), archive.getThumbnailMiddle(),
           archive.getThumbnailBlack(), archive.getBgResource(), archive.getBgResourceBig()}) {
-        if (isPictureName(name))
+        if (isPictureName(name)) {
             std::remove((folder + name).c_str());
+            RefusedWrites::forget(folder + name);
+        }
     }
-    return isRemoved ? 1 : 0;
+    return 1;
 }
 
 int ArchiveManager::checkFilesUnderFolder(std::string folder)
@@ -185,24 +191,10 @@ bool ArchiveManager::isPictureName(const std::string& name)
                    .compare(QLatin1String("xml"), Qt::CaseInsensitive) != 0;
 }
 
-std::vector<ArchiveOrder> ArchiveManager::orderRowsFor(const std::vector<std::string>& files)
-{
-    std::vector<ArchiveOrder> rows;
-    for (const std::string& file : files) {
-        if (!isTitleFile(file))
-            continue;
-        ArchiveOrder row;
-        row.setArchiveIndex(static_cast<int>(rows.size()));
-        row.setArchivePath(fileNameOf(file));
-        rows.push_back(row);
-    }
-    return rows;
-}
-
 int ArchiveManager::createNewOrderXML(std::string folder)
 {
     const std::vector<std::string> files = TitleParserUtility::queryFilesInFolder(folder);
-    setArchivesSortUnderFolder(std::move(folder), orderRowsFor(files));
+    setArchivesSortUnderFolder(std::move(folder), FolderOrder::rowsByName(files));
     return 1;
 }
 

@@ -41,9 +41,6 @@ public:
     // Makes a new order file when a title of the folder has no file. 1 when it did.
     int checkFilesUnderFolder(std::string folder);
 
-    // Rows for those of the files that an order file names, numbered from 0.
-    static std::vector<ArchiveOrder> orderRowsFor(const std::vector<std::string>& files);
-
     // Whether a path is that of an XML file other than the order file, whatever the case of its letters. A
     // name that is not UTF-8 is none: such a file is neither shown nor cleaned up.
     static bool isTitleFile(const std::string& path);

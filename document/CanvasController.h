@@ -15,8 +15,9 @@ class CanvasController
 public:
     CanvasController();
 
-    // Writes the title to the path in its record. An empty path does nothing.
-    void saveArchiveChange(QString path, Archive* archive);
+    // Writes the title to the path in its record. What the disk refuses is kept and written when the disk
+    // takes it (RefusedWrites). Returns whether the file is written; an empty path does nothing.
+    bool saveArchiveChange(QString path, Archive* archive);
 
     // 1 when the style was read; 0 leaves it as it was.
     int getTextStyle(FontStyle* style);

@@ -1,8 +1,8 @@
 #include "document/FolderTitles.h"
 
 #include "document/Archive.h"
-#include "document/ArchiveOrder.h"
 #include "document/DocumentConstants.h"
+#include "document/FolderOrder.h"
 #include "document/TitleParser.h"
 #include "support/ConfinedPath.h"
 
@@ -38,15 +38,18 @@ void onAllCores(std::size_t count, const Job& job)
 
 } // namespace
 
-FolderTitles::FolderTitles(std::string folder) : mFolder(std::move(folder))
+FolderTitles::FolderTitles(std::string folder, WithoutOrder withoutOrder) : mFolder(std::move(folder))
 {
     if (mFolder.empty())
         return;
-    const std::vector<ArchiveOrder*> rows = TitleParser().readFileOrderInFolder(mFolder);
-    const std::vector<std::unique_ptr<ArchiveOrder>> owner(rows.begin(), rows.end());
+    std::vector<ArchiveOrder> rows;
+    if (withoutOrder == WithoutOrder::ByName)
+        rows = FolderOrder::rowsToShow(mFolder);
+    else
+        FolderOrder::read(mFolder, rows);
     mNames.reserve(rows.size());
-    for (const ArchiveOrder* row : rows)
-        mNames.push_back(row->getArchivePath());
+    for (const ArchiveOrder& row : rows)
+        mNames.push_back(row.getArchivePath());
 }
 
 std::string FolderTitles::path(std::size_t row) const

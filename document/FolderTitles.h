@@ -12,8 +12,11 @@ class Archive;
 class FolderTitles
 {
 public:
-    // An empty path and a folder without an order file give no rows.
-    explicit FolderTitles(std::string folder);
+    // What a folder shows whose order file is missing or cannot be read.
+    enum class WithoutOrder { Nothing, ByName };
+
+    // An empty path gives no rows.
+    explicit FolderTitles(std::string folder, WithoutOrder withoutOrder = WithoutOrder::Nothing);
 
     std::size_t count() const { return mNames.size(); }
     // Name of the title file relative to the folder; empty for a blank row.

@@ -1,4 +1,5 @@
-// File-level service for titles. Strings are UTF-8. Results are 1 for done and 0 for refused; the caller owns
+// File-level service for titles. Strings are UTF-8. Results are 1 for done and 0 for refused, -1 where it was
+// the disk that refused to write, with errno; the caller owns
 // the records of a returned vector.
 #pragma once
 
@@ -47,7 +48,7 @@ public:
 
     virtual std::string getTitleRootFolderPath() = 0;
 
-    // Writes an order file that names the XML files of the folder in the directory's order.
+    // Writes an order file that names the XML files of the folder by name.
     virtual int createNewOrderXML(std::string folder) = 0;
 
     virtual ~IArchiveManager() {}

@@ -7,7 +7,6 @@
 
 #include <QPainter>
 #include <algorithm>
-#include <boost/filesystem.hpp>
 #include <mutex>
 
 std::string ImageResizer::checkerFname_in_title;
@@ -133,16 +132,8 @@ bool ImageResizer::resizeImageToThumbnailTitlerWithAlpha(const std::wstring& pat
 
 bool ImageResizer::save(const QImage& image, const std::wstring& path)
 {
-    if (!checkJPE(path))
-        return PngWriter::save(image, QString::fromStdWString(path));
-    // Qt chooses the format by the extension and does not know this one.
-    const std::wstring alternative = changeJPEToJPEG(path);
-    boost::system::error_code error;
-    boost::filesystem::remove(wideToMultiByte(alternative), error);
-    if (!PngWriter::save(image, QString::fromStdWString(alternative)))
-        return false;
-    boost::filesystem::rename(wideToMultiByte(alternative), wideToMultiByte(path), error);
-    return true;
+    const QString file = QString::fromStdWString(path);
+    return mTitle.empty() ? PngWriter::save(image, file) : PngWriter::saveOrKeep(image, file, mTitle);
 }
 
 bool ImageResizer::isAvailableImage(std::wstring path)

@@ -4,12 +4,17 @@
 
 #include <QImage>
 #include <string>
+#include <utility>
 
 class ImageResizer
 {
 public:
     // Looks the folder of the checker pictures up.
     ImageResizer();
+
+    // From here on pictures that the disk refuses are kept for this title (PngWriter::saveOrKeep), and no
+    // save waits for the disk to sync.
+    void keepRefusedFor(std::string title) { mTitle = std::move(title); }
 
     // Reduces the picture at source by four in each direction and saves it twice: over black to blackPath,
     // and over the checker picture to smallPath (opaque pictures are the same in both). width and height are
@@ -44,6 +49,8 @@ private:
     bool resizeImageToThumbnailImageWithAlpha(const std::wstring& path, const QImage& reduced);
     bool resizeImageToThumbnailTitlerWithAlpha(const std::wstring& path, const QImage& composed);
     bool save(const QImage& image, const std::wstring& path);
+
+    std::string mTitle; // empty: what the disk refuses is not kept
 
     static std::string checkerFname_in_title;
     static std::string checkerFname_in_logo;

@@ -4,9 +4,18 @@
 #include "document/TitleParserUtility.h"
 #include "support/FolderLookup.h"
 #include "support/IPathManagerEx.h"
+#include "support/LogManager.h"
 #include "support/XmlFile.h"
 
+#include <QString>
 #include <tinyxml.h>
+
+namespace
+{
+
+constexpr int LOG_NUMBER = 400;
+
+}
 
 LastSettingParser::LastSettingParser(std::string folder)
 {
@@ -27,7 +36,7 @@ bool LastSettingParser::createTempFile(const std::string& element, const std::st
     auto* entry = new TiXmlElement(element);
     entry->SetAttribute(attribute, value);
     root->LinkEndChild(entry);
-    return XmlFile::save(document, mFilePath);
+    return save(document);
 }
 
 bool LastSettingParser::editTempFile(const std::string& element, const std::string& attribute,
@@ -45,7 +54,17 @@ bool LastSettingParser::editTempFile(const std::string& element, const std::stri
         root->LinkEndChild(entry);
     }
     entry->SetAttribute(attribute, value);
-    return XmlFile::save(document, mFilePath);
+    return save(document);
+}
+
+// Without it the next session begins elsewhere: nothing that an operator must know of.
+bool LastSettingParser::save(const TiXmlDocument& document)
+{
+    if (mFilePath.empty() || XmlFile::save(document, mFilePath))
+        return !mFilePath.empty();
+    LOG_DEBUG_OPERATE(L"LastSettingParser", LOG_NUMBER,
+                      QString::fromStdString("cannot write " + mFilePath).toStdWString());
+    return false;
 }
 
 std::string LastSettingParser::getTempAttribute(const std::string& element, const std::string& attribute)

@@ -4,6 +4,8 @@
 
 #include <string>
 
+class TiXmlDocument;
+
 class LastSettingParser
 {
 public:
@@ -27,5 +29,7 @@ public:
     std::string getTempAttribute(const std::string& element, const std::string& attribute);
 
 private:
+    bool save(const TiXmlDocument& document);
+
     std::string mFilePath;
 };

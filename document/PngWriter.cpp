@@ -1,11 +1,14 @@
 #include "document/PngWriter.h"
 
+#include "support/RefusedWrites.h"
+
 #include <QBuffer>
 #include <QColorSpace>
 #include <QFileInfo>
 #include <QImageWriter>
 #include <QtEndian>
 #include <algorithm>
+#include <cerrno>
 #include <cstring>
 #include <libdeflate.h>
 #include <memory>
@@ -152,16 +155,34 @@ QByteArray PngWriter::encode(const QImage& image)
     }
 }
 
+QByteArray PngWriter::encodeFor(const QImage& image, const QString& path)
+{
+    const QByteArray format = QFileInfo(path).suffix().toLower().toLatin1();
+    if (image.isNull() || format.isEmpty())
+        return {};
+    if (format == "jpe") // which Qt does not know
+        return encodeByQt(image, "jpeg");
+    return format == "png" ? encode(image) : encodeByQt(image, format);
+}
+
 bool PngWriter::save(const QImage& image, const QString& path, AtomicFile::Durability durability)
 {
-    if (image.isNull())
-        return false;
-    const QByteArray format = QFileInfo(path).suffix().toLower().toLatin1();
-    if (format.isEmpty())
-        return false;
-    const QByteArray bytes = format == "png" ? encode(image) : encodeByQt(image, format);
+    const QByteArray bytes = encodeFor(image, path);
+    return !bytes.isEmpty() &&
+           AtomicFile::write(path.toStdString(), {bytes.constData(), static_cast<std::size_t>(bytes.size())},
+                             durability, AtomicFile::Links::Replace);
+}
+
+bool PngWriter::saveOrKeep(const QImage& image, const QString& path, const std::string& title)
+{
+    const QByteArray bytes = encodeFor(image, path);
     if (bytes.isEmpty())
         return false;
-    return AtomicFile::write(path.toStdString(), {bytes.constData(), static_cast<std::size_t>(bytes.size())},
-                             durability, AtomicFile::Links::Replace);
+    const std::string file = path.toStdString();
+    if (AtomicFile::write(file, {bytes.constData(), static_cast<std::size_t>(bytes.size())},
+                          AtomicFile::Durability::SyncLater, AtomicFile::Links::Replace))
+        return true;
+    const int error = errno;
+    RefusedWrites::keep(file, bytes.toStdString(), error, title);
+    return false;
 }

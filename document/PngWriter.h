@@ -7,6 +7,7 @@
 #include <QByteArray>
 #include <QImage>
 #include <QString>
+#include <string>
 
 class PngWriter
 {
@@ -17,6 +18,13 @@ public:
     static bool save(const QImage& image, const QString& path,
                      AtomicFile::Durability durability = AtomicFile::Durability::Automatic);
 
+    // As save, without waiting for the disk to sync. A picture that the disk refuses is kept for its title,
+    // and written when the disk takes it (RefusedWrites).
+    static bool saveOrKeep(const QImage& image, const QString& path, const std::string& title);
+
     // The bytes of a PNG file; empty for a null picture.
     static QByteArray encode(const QImage& image);
+
+private:
+    static QByteArray encodeFor(const QImage& image, const QString& path);
 };

@@ -37,8 +37,7 @@ int SettingManager::saveLastTextParameter(FontStyle* style)
     auto* element = new TiXmlElement(SETTING_FONT_STYLE);
     setFontStyle(element, style);
     root->LinkEndChild(element);
-    XmlFile::save(document, mFilePath); // a refused save is not reported
-    return 1;
+    return XmlFile::save(document, mFilePath) ? 1 : 0;
 }
 
 int SettingManager::resetTextParameter()

@@ -4,6 +4,7 @@
 #include "document/DocumentConstants.h"
 #include "document/TText.h"
 #include "document/TitleParserUtility.h"
+#include "support/AtomicFile.h"
 #include "support/Utf8.h"
 #include "support/XmlFile.h"
 
@@ -151,19 +152,23 @@ int TitleParser::writeOneTitle(Archive* archive)
 {
     if (!archive || archive->getPath().empty())
         return 0;
+    return AtomicFile::write(archive->getPath(), toBytes(*archive)) ? 1 : -1;
+}
+
+std::string TitleParser::toBytes(const Archive& archive)
+{
     TiXmlDocument document;
     document.LinkEndChild(new TiXmlDeclaration(XML_VERSION, XML_ENCODING, STR_EMPTY));
     auto* root = new TiXmlElement(TITLE_NODE_ROOT); // linked elements belong to the document
-    writeMetaRoot(root, *archive);
+    writeMetaRoot(root, archive);
     document.LinkEndChild(root);
     auto* background = new TiXmlElement(NODE_BG);
-    writeMetaBackground(background, *archive);
+    writeMetaBackground(background, archive);
     root->LinkEndChild(background);
     auto* metaText = new TiXmlElement(NODE_TEXT_OBJ);
-    writeMetaText(metaText, *archive);
+    writeMetaText(metaText, archive);
     root->LinkEndChild(metaText);
-    XmlFile::save(document, archive->getPath()); // a refused save is not reported
-    return 1;
+    return XmlFile::toBytes(document);
 }
 
 int TitleParser::writeMetaRoot(TiXmlElement* root, const Archive& archive)
@@ -427,8 +432,7 @@ int TitleParser::modifyAttributeValue(const std::string& path, const std::string
     if (!root)
         return 0;
     setText(root, key.c_str(), value);
-    XmlFile::save(document, path); // a refused save is not reported
-    return 1;
+    return XmlFile::save(document, path) ? 1 : -1;
 }
 
 int TitleParser::modifyProp(KeyDefine::TITLE_PROP_ID_t id, std::string path, std::string value)

@@ -74,16 +74,19 @@ public:
     static constexpr char ORDER_INDEX_VAL[] = "value";
     static constexpr char ORDER_INDEX_FILEPATH[] = "file-path";
 
-    // Writes the title to the path in its record. 1 also when the disk refused the bytes: then the file that
-    // was there before is still there, whole. 0 for an empty path.
+    // Writes the title to the path in its record. -1, with errno, when the disk refuses the bytes: then the
+    // file that was there before is still there, whole. 0 for an empty path.
     int writeOneTitle(Archive* archive);
+
+    // The bytes of the title's file.
+    std::string toBytes(const Archive& archive);
 
     // Fills the record; on 0 it may be partly filled. Sets neither name nor order. Text objects that were in
     // the record are not freed.
     int readOneTitle(std::string path, Archive* archive);
 
-    // Change root attributes of a title file in place. 0 when the file cannot be read; a failed save is not
-    // reported.
+    // Change root attributes of a title file in place. 0 when the file cannot be read, -1 when the disk
+    // refuses it.
     int modifyProp(KeyDefine::TITLE_PROP_ID_t id, std::string path, std::string value);
     int modifyAttributeValue(const std::string& path, const std::string& key, const std::string& value);
     int modifyClip(std::string path, std::string value);
@@ -93,7 +96,7 @@ public:
     // Rows of the folder's order file in document order, empty when it cannot be read. The caller owns them.
     std::vector<ArchiveOrder*> readFileOrderInFolder(std::string folder);
 
-    // Replaces the order file; always 1.
+    // Replaces the order file. -1, with the old file untouched, when the disk refuses.
     int writeFileOrderInFolder(std::string folder, std::vector<ArchiveOrder> rows);
 
     // The titles of a folder in the order of its order file; those that cannot be read are left out. The

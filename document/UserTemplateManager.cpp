@@ -5,6 +5,7 @@
 #include "document/ArchiveManager.h"
 #include "document/ArchiveOrder.h"
 #include "document/DocumentConstants.h"
+#include "document/FolderOrder.h"
 #include "document/LastSettingParser.h"
 #include "document/TitleParserUtility.h"
 #include "support/ConfinedPath.h"
@@ -161,7 +162,9 @@ int UserTemplateManager::createNewOrderXml()
         row.setArchivePath(name + STR_SLASH + TITLE_STEM + XML_EXTENSION);
         rows.push_back(row);
     }
-    return ArchiveManager().setArchivesSortUnderFolder(mRootFolder, std::move(rows));
+    if (!isFolder(mRootFolder))
+        return 0;
+    return FolderOrder::writeOrKeep(mRootFolder, rows) ? 1 : -1;
 }
 
 int UserTemplateManager::renameInOrderXml(std::string oldName, std::string newName)
@@ -223,8 +226,7 @@ int UserTemplateManager::createNewTemplateXml(std::string name, Archive* archive
     archive->setThumbnailSmall(TITLE_STEM + THUMBNAIL_SMALL + extension);
     archive->setBgResource(TITLE_STEM + BG_SOURCE + extension);
     archive->setBgResourceBig(TITLE_STEM + BG_SOURCE_BIG + extension);
-    ArchiveManager().saveArchive(archive);
-    return 1;
+    return ArchiveManager().saveArchive(archive);
 }
 
 int UserTemplateManager::deleteTemplatePath(std::string path)

@@ -49,7 +49,7 @@ public:
 
     // Writes the title file of a template whose folder holds its pictures already, over one that is there,
     // and names title file and pictures in the record. 0 when there is no such folder, or no such name of a
-    // folder.
+    // folder; -1 when the disk refuses.
     int createNewTemplateXml(std::string name, Archive* archive);
 
     // Removes the template with this title file, its folder and all that this holds, and makes the order

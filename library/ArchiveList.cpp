@@ -1,10 +1,11 @@
 #include "library/ArchiveList.h"
 
+#include "canvas/SaveOutage.h"
 #include "document/Archive.h"
 #include "document/ArchiveController.h"
 #include "document/ArchiveOrder.h"
+#include "document/FolderOrder.h"
 #include "document/FolderTitles.h"
-#include "document/TitleParser.h"
 #include "library/ArchiveCheckThread.h"
 #include "library/ArchiveInitThread.h"
 #include "library/ArchiveItem.h"
@@ -18,7 +19,6 @@
 #include "support/IPathManagerEx.h"
 #include "support/LeftoverSweep.h"
 #include "support/LogManager.h"
-#include "support/XmlFile.h"
 
 #include <QCoreApplication>
 #include <QDir>
@@ -28,7 +28,7 @@
 #include <QLabel>
 #include <algorithm>
 #include <string>
-#include <tinyxml.h>
+#include <unordered_set>
 #include <utility>
 #include <vector>
 
@@ -74,6 +74,7 @@ ArchiveList::ArchiveList(QLabel* folderLabel, bool autoInit, QWidget* parent)
         mFolderLabel->setText(tr("Folder"));
     }
     initArchiveListConnect();
+    SaveOutage::instance(); // from here on the order may be saved
     sweepTitleFolders();
     mController->reCreateOrderXml();
     if (autoInit)
@@ -133,6 +134,7 @@ void ArchiveList::initArchiveListData()
         return;
     setFolderLabel();
     endInitThread();
+    prepareOrder();
     mInitThread = std::make_unique<ArchiveInitThread>(mCurrentPath);
     connect(mInitThread.get(), &ArchiveInitThread::threadGetArchiveListFinished, this,
             &ArchiveList::getArchiveListSuccessed, Qt::BlockingQueuedConnection);
@@ -185,6 +187,7 @@ ArchiveItem* ArchiveList::createPasteUndoItem(Archive* archive, ArchiveItem* ite
 void ArchiveList::initArchiveListRefreshData()
 {
     setFolderLabel();
+    prepareOrder();
     readFolder();
     if (ITitlerFolderReporter* reporter = ITitlerFolderReporter::instance())
         reporter->editFolderStartStatus(mCurrentPath);
@@ -194,7 +197,8 @@ void ArchiveList::initArchiveListRefreshData()
 // least is known.
 void ArchiveList::readFolder()
 {
-    const auto titles = std::make_shared<const FolderTitles>(mCurrentPath.toStdString());
+    const auto titles =
+        std::make_shared<const FolderTitles>(mCurrentPath.toStdString(), FolderTitles::WithoutOrder::ByName);
     std::vector<std::unique_ptr<ScrollViewerRow>> rows;
     rows.reserve(titles->count());
     std::size_t next = 0;
@@ -354,6 +358,11 @@ void ArchiveList::giveBackItems()
     }
 }
 
+void ArchiveList::prepareOrder()
+{
+    mCleanUp = mController->prepareOrder(mCurrentPath) ? CleanUp::Allowed : CleanUp::Withheld;
+}
+
 void ArchiveList::setFolderLabel()
 {
     if (mFolderLabel)
@@ -503,8 +512,12 @@ QList<ArchiveOrder*> ArchiveList::getArchiveOrderList() const
 
 void ArchiveList::saveArchiveListOrder()
 {
+    std::unordered_set<std::string> known;
+    for (const ArchiveItem* item : mItems.all()) // also those that only undo commands hold
+        known.insert(QFileInfo(item->getArchiveDataPath()).fileName().toStdString());
     const QList<ArchiveOrder*> orders = getArchiveOrderList();
-    mController->saveArchiveListOrder(mCurrentPath, orders);
+    if (!mController->saveListedOrder(mCurrentPath, orders, known))
+        mCleanUp = CleanUp::Withheld;
     qDeleteAll(orders);
 }
 
@@ -565,16 +578,17 @@ void ArchiveList::synchronizationFolderFile()
 {
     if (mCurrentPath.isEmpty())
         return;
-    // Without an order, which a full disk did not take, or with a torn one the clean-up would count every
-    // title as deleted. The next start makes one from what the folder holds.
-    const QString order = mCurrentPath + QLatin1Char('/') + QLatin1String(TitleParser::ORDER_FILEPATH);
-    TiXmlDocument document;
-    const auto isReadable = [&] {
-        return XmlFile::load(order.toStdString(), document) && document.RootElement();
-    };
-    const auto namesTitles = [&] { return isReadable() && document.RootElement()->FirstChildElement(); };
-    if (!isEmpty() && !namesTitles())
+    if (!isEmpty() && orderIsDamaged())
         saveArchiveListOrder();
-    if (isEmpty() ? isReadable() : namesTitles())
+    if (mCleanUp == CleanUp::Allowed)
         mController->deleteUnusefulArchives(mCurrentPath);
+}
+
+// Whether the folder's order is not the list's: the disk has not taken it, or another program has harmed it.
+bool ArchiveList::orderIsDamaged() const
+{
+    const std::string folder = mCurrentPath.toStdString();
+    std::vector<ArchiveOrder> rows;
+    return FolderOrder::isKept(folder) || FolderOrder::read(folder, rows) != FolderOrder::State::Whole ||
+           rows.empty();
 }

@@ -80,7 +80,8 @@ public:
     // Empties the list, the path and the label.
     void cleanArchiveList();
     void clearCopyArchive();
-    // Removes the files of titles that are no longer in the list.
+    // Removes the files of titles that are no longer in the list, if the folder's order can be trusted to
+    // name all others.
     void synchronizationFolderFile();
     void stopArchiveListTapAndHoldTimer() { stopTapAndHoldTimer(); }
     void setSystemLanFont(QString family);
@@ -96,6 +97,7 @@ public:
 
     // One entry an item, with its index and file name; the caller owns the entries.
     QList<ArchiveOrder*> getArchiveOrderList() const;
+    // What the disk refuses is kept and written when it takes it.
     void saveArchiveListOrder();
 
     // Emits startTemplatePicker. Any thread.
@@ -179,6 +181,8 @@ private:
     void decodeCopyBackground();
     void resetPositions();
     void setFolderLabel();
+    void prepareOrder();
+    bool orderIsDamaged() const;
     void offerTemplateOrReportFull();
     void showOptionMenu(KSBaseItemWidget* item, QPoint pos, KSScrollViewerWidget* scrollArea);
     void createOptionMenu();
@@ -212,6 +216,10 @@ private:
     QLabel* mFolderLabel;
     CanvasScene* mMainScene = nullptr;
     QPointer<ITitlerAPPEventFilterController> mEventController;
+    // A folder whose order could not be read when it was opened, or not be written since, is not cleaned up
+    // before it is opened again.
+    enum class CleanUp { Allowed, Withheld };
+    CleanUp mCleanUp = CleanUp::Withheld;
     QString mCurrentPath;
     QFont mMenuFont;
     QPointer<ArchiveItem> mSelectedItem;

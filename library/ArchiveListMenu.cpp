@@ -20,7 +20,6 @@
 #include <QLabel>
 #include <QWheelEvent>
 #include <string>
-#include <unistd.h>
 #include <utility>
 
 namespace
@@ -190,8 +189,11 @@ void ArchiveList::createArchiveFromTemplate(Archive* temp)
         return;
     }
     std::unique_ptr<Archive> archive = mFiles.createFromTemplate(mCurrentPath, *temp);
-    if (!archive)
+    if (!archive) {
+        if (!mCurrentPath.isEmpty()) // the disk refused
+            ListMessages::post(MessageDef::MESSAGE_DISK_FULL_ON_CREATE, tr("File"));
         return;
+    }
     IEditContext* context = IEditContext::instance();
     if (mOperationPosition == -1 && context && context->isCreateNew())
         mOperationPosition = count() - 1;
@@ -248,8 +250,11 @@ void ArchiveList::exePasteArchive()
     if (!mCopyArchive)
         return;
     std::unique_ptr<Archive> archive = mFiles.createFromCopy(mCurrentPath, *mCopyArchive, mCopyPictures);
-    if (!archive)
+    if (!archive) {
+        if (!mCurrentPath.isEmpty())
+            ListMessages::post(MessageDef::MESSAGE_DISK_FULL_ON_PASTE);
         return;
+    }
     if (mCopyDecoder.valid())
         mCopyBackground = BackgroundPicture::load(mCopyDecoder.get());
     emitPasteCommand(std::move(archive));
@@ -292,8 +297,11 @@ void ArchiveList::exeAddUserArchive()
         waitForCanvas();
     const Archive source(*mOperationItem->getArchiveData());
     const std::unique_ptr<Archive> target = mFiles.createUserTemplate(root, name, source);
-    if (!target)
+    if (!target) {
+        if (!root.isEmpty())
+            ListMessages::post(MessageDef::MESSAGE_DISK_FULL_ON_TEMPLATE, name);
         return;
+    }
     TitleReports::titleChanged(FileManagerDefine::TITLE_TEMPLATE_ADDED,
                                QFileInfo(QString::fromStdString(target->getPath())).path());
     Q_EMIT addUserSignal(QFileInfo(QString::fromStdString(target->getName())).path());
@@ -305,8 +313,8 @@ void ArchiveList::exeAddUserArchive()
 void ArchiveList::waitForCanvas()
 {
     setDefaultItemState(mSelectedItem);
-    while (mMainScene && !mMainScene->isEditFinish())
-        ::sleep(1);
+    if (mMainScene)
+        mMainScene->waitForPictures();
     mSelectedItem->setStyleSheet(ArchiveItem::UN_OPERATE_AND_SELECT_STATE);
     mSelectedItem->setSelected(true);
 }

@@ -93,6 +93,8 @@ Q_SIGNALS:
     void changeFolderFile(QString path, QString fileName);
     // The folder that is open in the editor was renamed elsewhere.
     void folderNameChange(QString before, QString after);
+    // A folder was renamed, here or elsewhere, whether it is open or not. Comes first.
+    void folderMoved(QString before, QString after);
     void clearUndoCommandStack();
     void signalCancelClicked();
 

@@ -493,6 +493,7 @@ void FolderPicker::doEdit(const QString& name, const QModelIndex& index)
         return;
     mCommitted = true;
     bool made = false;
+    const FolderEdit action = mAction;
     switch (mAction) {
     case FOLDER_EDIT_RENAME:
         doRename(name, index);
@@ -510,6 +511,12 @@ void FolderPicker::doEdit(const QString& name, const QModelIndex& index)
     case FOLDER_EDIT_NONE:
         return;
     }
+    if (action != FOLDER_EDIT_RENAME && !QFileInfo(folderPath(name)).isDir()) {
+        mCommitted = false; // its row goes with the editor
+        ListMessages::post(action == FOLDER_EDIT_DUPLICATE ? MessageDef::MESSAGE_DISK_FULL_ON_DUPLICATE
+                                                           : MessageDef::MESSAGE_DISK_FULL_ON_CREATE,
+                           tr("folder"));
+    }
     canSendSignal(name, made);
     mTree->viewport()->update();
 }
@@ -520,8 +527,11 @@ void FolderPicker::doRename(const QString& name, const QModelIndex& index)
     const bool renamed = mController.renameFolder(mRootPath, mOldName, name);
     const QString now = renamed ? name : mOldName;
     if (renamed) {
+        Q_EMIT folderMoved(folderPath(mOldName), folderPath(name));
         mFactory->renameFolder(mOldName, name);
         insertChildrenIndex(index, name);
+    } else if (name != mOldName) {
+        ListMessages::post(MessageDef::MESSAGE_DISK_FULL_ON_CREATE, tr("folder"));
     }
     setAttributeAtDoEdit(index, now);
     if (ITitlerFolderReporter* reporter = ITitlerFolderReporter::instance())

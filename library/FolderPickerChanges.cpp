@@ -4,6 +4,7 @@
 #include "library/FolderPicker.h"
 #include "library/FolderPickerFactory.h"
 #include "support/ConfinedPath.h"
+#include "support/RefusedWrites.h"
 #include "touchui/KSInputContext.h"
 #include "touchui/KSModelAttributeItem.h"
 #include "touchui/KSPushbutton.h"
@@ -71,6 +72,7 @@ void FolderPicker::folderNameChanged(FileManagerDefine::tagChangeFolderNameParam
                                  folderPath(after).toStdString());
         return;
     }
+    Q_EMIT folderMoved(folderPath(before), folderPath(after));
     if (isNameOf(before, mCurrentFolderName)) {
         mCurrentFolderName = after;
         Q_EMIT folderNameChange(folderPath(before), folderPath(after));
@@ -112,6 +114,9 @@ void FolderPicker::continuefolderNameChanged(QString after)
 void FolderPicker::slotDeleteFolder(std::wstring name)
 {
     const QString folder = plainName(name);
+    if (FolderNameRules::isFolderName(folder) && !QFileInfo::exists(folderPath(folder)))
+        RefusedWrites::forgetFolder(
+            folderPath(folder).toStdString()); // what could not be saved is not wanted
     if (isNameOf(folder, mCurrentFolderName))
         setCurrentFolderName(QString());
     // A folder that is only being made is none yet.

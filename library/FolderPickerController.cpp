@@ -54,8 +54,11 @@ bool FolderPickerController::duplicateFolder(const QString& root, const QString&
 {
     if (!QFileInfo(source).isDir() || !createFolder(root, name))
         return false;
-    copyFolderFile(QDir(source), QDir(root + QLatin1Char('/') + name));
-    return true;
+    const QString target = root + QLatin1Char('/') + name;
+    if (copyFolderFile(QDir(source), QDir(target)))
+        return true;
+    QDir(target).removeRecursively(); // half a folder is none
+    return false;
 }
 
 bool FolderPickerController::isDiskFull(const QString& path, bool withFolderSize) const

@@ -1,7 +1,6 @@
 #include "library/FolderPickerFactory.h"
 
-#include "document/ArchiveController.h"
-#include "document/ArchiveOrder.h"
+#include "document/FolderOrder.h"
 #include "library/FolderEditor.h"
 #include "library/FolderNameRules.h"
 #include "support/ConfinedPath.h"
@@ -119,9 +118,8 @@ QList<QFileInfo> FolderPickerFactory::getTitlerFiles(int, const QString& path)
     QList<QFileInfo> titles;
     if (mDisk.isNullDirectory(QFileInfo(path)))
         return titles;
-    ArchiveController controller; // keeps the rows
-    for (const ArchiveOrder* row : controller.getFileOrder(path)) {
-        const QString name = QString::fromStdString(row->getArchivePath());
+    for (const ArchiveOrder& row : FolderOrder::rowsToShow(path.toStdString())) {
+        const QString name = QString::fromStdString(row.getArchivePath());
         if (!FolderNameRules::isFolderName(name) || !QDir::match(QStringLiteral("*.xml"), name))
             continue;
         const QFileInfo info(path + QLatin1Char('/') + name);

@@ -6,8 +6,11 @@
 #include "document/PngWriter.h"
 #include "library/TitlerUtility.h"
 #include "support/AlternateStack.h"
+#include "support/RefusedWrites.h"
 
+#include <QDir>
 #include <QFile>
+#include <QFileInfo>
 #include <QMutexLocker>
 #include <future>
 #include <string>
@@ -54,6 +57,20 @@ void PictureThread::addArchive(const Archive* archive, QList<QImage> images)
     mCondition.wakeOne();
 }
 
+void PictureThread::folderRenamed(const QString& before, const QString& after)
+{
+    QMutexLocker lock(&mMutex);
+    for (Job& job : mJobs)
+        moveToFolder(*job.archive, before, after);
+}
+
+void PictureThread::moveToFolder(Archive& archive, const QString& before, const QString& after)
+{
+    const QFileInfo title(QString::fromStdString(archive.getPath()));
+    if (QDir::cleanPath(title.path()) == before)
+        archive.setPath((after + QLatin1Char('/') + title.fileName()).toStdString());
+}
+
 bool PictureThread::isThreadWaiting() const
 {
     return mUnfinished == 0;
@@ -74,7 +91,8 @@ void PictureThread::run()
             mJobs.pop_front();
         }
         saveArchiveThumnail(*job.archive, job.big, job.middle);
-        // The clean-up takes the title file first: what it found there it removes after this.
+        // The clean-up takes the title file first: what it found there it removes after this. Where the whole
+        // folder is away nothing was written: what is kept follows the folder, or goes with it.
         if (job.hadTitle && !hasTitle(*job.archive))
             removePictures(*job.archive);
         job = Job(); // the images go before the job counts as finished
@@ -91,8 +109,11 @@ void PictureThread::removePictures(const Archive& archive)
 {
     for (const std::string& name : {archive.getThumbnailBig(), archive.getThumbnailMiddle(),
                                     archive.getThumbnailBlack(), archive.getThumbnailSmall()}) {
-        if (const QString path = picturePath(archive, name); !path.isEmpty())
+        if (const QString path = picturePath(archive, name); !path.isEmpty()) {
             QFile::remove(path);
+            if (QFileInfo(path).dir().exists())
+                RefusedWrites::forget(path.toStdString());
+        }
     }
 }
 
@@ -104,12 +125,15 @@ void PictureThread::saveArchiveThumnail(const Archive& archive, const QImage& bi
     const QString smallPath = picturePath(archive, archive.getThumbnailSmall());
 
     // Four fifths of the work are in the big picture, which has a core of its own meanwhile. A picture that
-    // cannot be written is passed over: the others still help.
-    std::future<bool> bigSaved = std::async([&big, &bigPath] { return PngWriter::save(big, bigPath); });
-    PngWriter::save(middle, middlePath);
-    ImageResizer().resizeImageToThumbnail(middle, blackPath.toStdWString(), smallPath.toStdWString(),
-                                          static_cast<unsigned>(THUMBNAIL_SMALL_SIZE.width()),
-                                          static_cast<unsigned>(THUMBNAIL_SMALL_SIZE.height()));
+    // cannot be written is kept or passed over: the others still help.
+    const std::string title = archive.getPath();
+    std::future<bool> bigSaved = std::async([&] { return PngWriter::saveOrKeep(big, bigPath, title); });
+    PngWriter::saveOrKeep(middle, middlePath, title);
+    ImageResizer resizer;
+    resizer.keepRefusedFor(title);
+    resizer.resizeImageToThumbnail(middle, blackPath.toStdWString(), smallPath.toStdWString(),
+                                   static_cast<unsigned>(THUMBNAIL_SMALL_SIZE.width()),
+                                   static_cast<unsigned>(THUMBNAIL_SMALL_SIZE.height()));
     bigSaved.wait();
     if (ITitleChangeReporter* reporter = ITitleChangeReporter::instance())
         reporter->changeTitlerStatus(FileManagerDefine::TITLE_PICTURES_CHANGED,

@@ -1,4 +1,5 @@
-// Writes the four pictures of a title off the GUI thread, in the order in which they were asked for.
+// Writes the four pictures of a title off the GUI thread, in the order in which they were asked for. Each
+// replaces the one before when it is complete; the disk may sync them later.
 #pragma once
 
 #include <QImage>
@@ -27,12 +28,22 @@ public:
 
     // Queues one job; keeps a copy of the record. The first image is the 1920x1080 picture, the second the
     // 960x540 one. A null record or fewer images do nothing. A title that is deleted before its pictures are
-    // in place keeps none of them. GUI thread; never waits for a picture.
+    // in place keeps none of them. Pictures that the disk refuses are kept (RefusedWrites). GUI thread; never
+    // waits for a picture.
     void addArchive(const Archive* archive, QList<QImage> images);
 
     // True when no job is queued or being written. From the moment a job is queued this is false until its
     // files are in place. Any thread.
     bool isThreadWaiting() const;
+
+    // Jobs queued or being written. Any thread.
+    int unfinished() const { return mUnfinished; }
+
+    // Queued jobs for titles of the folder go to its new name. Any thread.
+    void folderRenamed(const QString& before, const QString& after);
+
+    // The record's files lie in the folder's new place, if they lay in it.
+    static void moveToFolder(Archive& archive, const QString& before, const QString& after);
 
 protected:
     void run() override;

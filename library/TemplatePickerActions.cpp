@@ -1,6 +1,7 @@
 // What the operator and the file manager do with templates.
 #include "canvas/MessageBoxController.h"
 #include "library/ArchiveItem.h"
+#include "library/ListMessages.h"
 #include "library/TemplateItem.h"
 #include "library/TemplatePicker.h"
 #include "library/TemplateScrollArea.h"
@@ -212,8 +213,11 @@ void TemplatePicker::slotImportNewUserTemplate(QString name)
     if (id != -1)
         overrideTemplate(id);
     auto archive = std::make_unique<Archive>();
-    if (mUserController.createNewTemplateXml(name.toStdString(), archive.get()) == 0) {
-        // No such folder: there is nothing to offer, nor is what had the name before.
+    const int result = mUserController.createNewTemplateXml(name.toStdString(), archive.get());
+    if (result < 0)
+        ListMessages::post(MessageDef::MESSAGE_DISK_FULL_ON_TEMPLATE, name);
+    if (result < 1) {
+        // No such folder, or no room: there is nothing to offer, nor is what had the name before.
         mUserController.removeFromOrderXml(name.toStdString());
         return;
     }

@@ -5,10 +5,11 @@
 #include "canvas/GraphicsText.h"
 #include "document/Archive.h"
 #include "document/TText.h"
-#include "library/TitlerUtility.h"
 #include "support/LogManager.h"
 
+#include <QDir>
 #include <QFile>
+#include <QFileInfo>
 #include <QGraphicsDropShadowEffect>
 #include <QPainter>
 #include <QPixmap>
@@ -101,6 +102,18 @@ bool ThumbnailRender::makePictureThreadIsFinished()
     return mPictureThread.isThreadWaiting();
 }
 
+int ThumbnailRender::unfinishedTitles()
+{
+    return static_cast<int>(mBigPictures.size()) + mPictureThread.unfinished();
+}
+
+void ThumbnailRender::folderRenamed(const QString& before, const QString& after)
+{
+    for (const std::unique_ptr<BigPicture>& job : mBigPictures)
+        PictureThread::moveToFolder(*job->archive, before, after);
+    mPictureThread.folderRenamed(before, after);
+}
+
 void ThumbnailRender::makeMiddleAndSmallSizeThumbnail(const Archive& archive)
 {
     createMiddleSizeCanvasSceneUsingArchiveData(archive);
@@ -158,7 +171,6 @@ void ThumbnailRender::clearMiddleSizeCanvasScene()
 
 void ThumbnailRender::makeBigSizeThumbnail(const Archive& archive)
 {
-    deleteOldFile(archive);
     auto job = std::make_unique<BigPicture>();
     job->archive = std::make_unique<Archive>(archive);
     job->hadTitle = QFile::exists(QString::fromStdString(archive.getPath()));
@@ -194,22 +206,12 @@ void ThumbnailRender::drawNextBigPicture()
     mBigPictures.pop_front();
     if (job->decoder.valid())
         job->decoder.wait();
-    if (job->hadTitle && !QFile::exists(QString::fromStdString(job->archive->getPath())))
+    const QFileInfo title(QString::fromStdString(job->archive->getPath()));
+    if (job->hadTitle && !title.exists() && title.dir().exists())
         return; // deleted meanwhile, with its pictures
     createBigSizeCanvasSceneUsingArchiveData(*job->archive, job->background);
     saveBigSizeThumnail(*job->archive, renderBigAndMiddleSizeCanvasScene());
     clearBigSizeCanvasScene();
-}
-
-void ThumbnailRender::deleteOldFile(const Archive& archive)
-{
-    const std::string path =
-        TitlerUtility::getPicturePathFromTitlePath(archive.getPath(), archive.getThumbnailBig());
-    if (path.empty())
-        return;
-    QFile file(QString::fromStdString(path));
-    if (file.exists() && !file.isOpen())
-        file.remove();
 }
 
 void ThumbnailRender::createBigSizeCanvasSceneUsingArchiveData(const Archive& archive,

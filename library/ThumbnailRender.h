@@ -48,6 +48,8 @@ public:
     // True when every queued picture has been written. What is still to be drawn is drawn first, so that
     // callers may wait without an event loop.
     bool makePictureThreadIsFinished() override;
+    int unfinishedTitles() override;
+    void folderRenamed(const QString& before, const QString& after) override;
 
     // Hooks for what a subclass may keep beside the scenes.
     virtual void clearBigSizeCanvasSceneResource();
@@ -62,7 +64,6 @@ private:
     void drawNextBigPicture();
     QImage renderMiddleSizeCanvasScene();
     QList<QImage> renderBigAndMiddleSizeCanvasScene();
-    static void deleteOldFile(const Archive& archive);
     void saveMiddleSizeThumnail(const Archive& archive, const QImage& image);
     void saveBigSizeThumnail(const Archive& archive, const QList<QImage>& images);
     void clearMiddleSizeCanvasScene();

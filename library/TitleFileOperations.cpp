@@ -79,6 +79,18 @@ bool hasOwnBackground(const Archive& archive)
     return !archive.isPreset() && !extensionOf(archive.getThumbnailSmall()).isEmpty();
 }
 
+// Removes what was made for a title that could not be made as a whole: the pictures whose names begin with
+// its stem, and no others.
+void removeFiles(const Archive& archive, const std::string& stem)
+{
+    for (const std::string& name :
+         {archive.getThumbnailBig(), archive.getThumbnailMiddle(), archive.getThumbnailBlack(),
+          archive.getThumbnailSmall(), archive.getBgResource(), archive.getBgResourceBig()}) {
+        if (name.starts_with(stem))
+            QFile::remove(pictureOf(archive, name));
+    }
+}
+
 } // namespace
 
 TitleFileOperations::TitleFileOperations(ArchiveController& controller) : mController(controller)
@@ -129,10 +141,11 @@ std::unique_ptr<Archive> TitleFileOperations::createFromTemplate(const QString& 
     renameRecord(*archive, folder);
     Archive from(source);
     mController.copyArchiveThumbnail(&from, archive.get());
-    if (hasOwnBackground(source))
-        mController.copyArchiveBg(&from, archive.get());
-    if (!mController.saveNewArchive(folder, archive.get()))
+    const bool isCopied = !hasOwnBackground(source) || mController.copyArchiveBg(&from, archive.get()) == 1;
+    if (!isCopied || !mController.saveNewArchive(folder, archive.get())) {
+        removeFiles(*archive, archive->getName());
         return nullptr;
+    }
     return archive;
 }
 
@@ -156,13 +169,16 @@ std::unique_ptr<Archive> TitleFileOperations::createFromCopy(const QString& fold
     // A photograph's files are several megabytes each; another core takes half of them.
     const std::future<void> written =
         std::async(std::launch::async, [&] { writePictures(*archive, pictures); });
+    bool isCopied = true;
     if (hasOwnBackground(copy)) {
         Archive from(copy);
-        mController.copyArchiveBg(&from, archive.get());
+        isCopied = mController.copyArchiveBg(&from, archive.get()) == 1;
     }
     written.wait();
-    if (!mController.saveNewArchive(folder, archive.get()))
+    if (!isCopied || !mController.saveNewArchive(folder, archive.get())) {
+        removeFiles(*archive, archive->getName());
         return nullptr;
+    }
     return archive;
 }
 
@@ -174,11 +190,11 @@ std::unique_ptr<Archive> TitleFileOperations::createUserTemplate(const QString& 
     const QString folder = root + QLatin1Char('/') + name;
     if (!SystemInfo::createFolders(folder.toStdWString())) {
         LOG_EVENT(L"ArchiveList", __LINE__, L"ERROR create dir.", 4);
-        // The folder of a template that was deleted is taken again. Without one the save, which is not told
-        // of a disk that refuses, would announce a template that is not there.
+        // The folder of a template that was deleted is taken again.
         if (!QFileInfo(folder).isDir())
             return nullptr;
     }
+    bool isCopied = true;
 
     auto target = std::make_unique<Archive>(source);
     target->setName((name + QLatin1Char('/') + TEMPLATE_STEM).toStdString());
@@ -195,9 +211,12 @@ std::unique_ptr<Archive> TitleFileOperations::createUserTemplate(const QString& 
         if (!source.getBgResourceBig().empty())
             target->setBgResourceBig((TEMPLATE_STEM + BG_SOURCE_BIG + extension).toStdString());
         Archive from(source);
-        mController.copyArchiveBg(&from, target.get());
+        isCopied = mController.copyArchiveBg(&from, target.get()) == 1;
     }
-    if (!mController.saveNewArchive(root, target.get()))
+    if (!isCopied || !mController.saveNewArchive(root, target.get())) {
+        removeFiles(*target, TEMPLATE_STEM.toStdString());
+        QDir().rmdir(folder); // if nothing else is in it
         return nullptr;
+    }
     return target;
 }

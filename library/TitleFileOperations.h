@@ -39,7 +39,8 @@ public:
     static QString freeStem(const QString& folder, const QDateTime& now = QDateTime::currentDateTime());
 
     // Copies the template's pictures under new names and writes the title file. Null when the folder is empty
-    // or the file is refused.
+    // or the disk refuses the title file or its background; then nothing of it is left. A picture that is
+    // refused is made when the title is opened.
     std::unique_ptr<Archive> createFromTemplate(const QString& folder, const Archive& source) const;
 
     // What createFromCopy needs besides the record; unreadable pictures stay empty.
@@ -51,8 +52,8 @@ public:
                                             const TitlePictures& pictures) const;
 
     // Makes the folder of a user template of this name in the root and in it the title file, with copies of
-    // the small picture and the background. The record's name is "<name>/Titler". Null when there is no
-    // folder for it or the title file is refused.
+    // the small picture and the background. The record's name is "<name>/Titler". Null as above, or when
+    // there is no folder for it.
     std::unique_ptr<Archive> createUserTemplate(const QString& root, const QString& name,
                                                 const Archive& source) const;
 

@@ -3,6 +3,7 @@
 #include "support/FileSyncQueue.h"
 #include "support/HiddenName.h"
 #include "support/OwnerOnlyFiles.h"
+#include "support/RefusedWrites.h"
 
 #include <cerrno>
 #include <climits>
@@ -71,13 +72,6 @@ bool copyAll(int from, int to)
     }
 }
 
-void syncFolder(const std::string& folder)
-{
-    const Descriptor descriptor(::open(folder.c_str(), O_RDONLY | O_DIRECTORY | O_CLOEXEC));
-    if (descriptor.isOpen())
-        ::fsync(descriptor.get());
-}
-
 // The file that a path leads to, and what is there now.
 struct Target {
     std::string path;
@@ -87,8 +81,10 @@ struct Target {
 
 bool resolve(const std::string& path, AtomicFile::Links links, Target& target)
 {
-    if (path.empty() || path.find('\0') != std::string::npos)
+    if (path.empty() || path.find('\0') != std::string::npos) {
+        errno = EINVAL;
         return false;
+    }
     target.path = std::filesystem::path(path).lexically_normal().native();
     if (::lstat(target.path.c_str(), &target.status) != 0)
         return errno == ENOENT;
@@ -135,8 +131,10 @@ bool replaceFile(const std::string& path, AtomicFile::Durability durability, Ato
     if (!resolve(path, links, target))
         return false;
     if (target.exists) {
-        if (S_ISDIR(target.status.st_mode))
+        if (S_ISDIR(target.status.st_mode)) {
+            errno = EISDIR;
             return false;
+        }
         if (!S_ISREG(target.status.st_mode)) { // a device takes the bytes as they come
             Descriptor device(::open(target.path.c_str(), O_WRONLY | O_CLOEXEC | O_NONBLOCK));
             return device.isOpen() && fill(device.get()) && device.close();
@@ -152,16 +150,23 @@ bool replaceFile(const std::string& path, AtomicFile::Durability durability, Ato
     Descriptor descriptor = openTemporary(target, temporary);
     if (!descriptor.isOpen())
         return false;
+    errno = 0;
     bool isDone = fill(descriptor.get()) && (!isNow || ::fdatasync(descriptor.get()) == 0);
+    const int reason = errno;
     isDone = descriptor.close() && isDone;
+    if (reason != 0)
+        errno = reason;
     if (isDone) {
         isDone = isNow ? FileSyncQueue::publishSynced(temporary, target.path)
                        : FileSyncQueue::publish(temporary, target.path);
     }
-    if (!isDone)
+    if (!isDone) {
+        const int error = errno;
         ::unlink(temporary.c_str());
-    else if (isNow)
-        syncFolder(HiddenName::folderOf(target.path));
+        errno = error;
+    } else if (isNow && !FileSyncQueue::syncFolder(HiddenName::folderOf(target.path))) {
+        FileSyncQueue::enqueue(target.path); // in its place for every reader; the disk is asked again
+    }
     return isDone;
 }
 
@@ -169,8 +174,12 @@ bool replaceFile(const std::string& path, AtomicFile::Durability durability, Ato
 
 bool AtomicFile::write(const std::string& path, std::string_view bytes, Durability durability, Links links)
 {
-    return replaceFile(path, durability, links,
-                       [bytes](int descriptor) { return writeAll(descriptor, bytes); });
+    const unsigned long moment = RefusedWrites::moment();
+    if (!replaceFile(path, durability, links,
+                     [bytes](int descriptor) { return writeAll(descriptor, bytes); }))
+        return false;
+    RefusedWrites::forgetUpTo(moment, path);
+    return true;
 }
 
 bool AtomicFile::copy(const std::string& source, const std::string& target, Durability durability)

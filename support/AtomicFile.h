@@ -28,7 +28,8 @@ public:
 
     // Replaces the file at path, or makes it. False, with the old file untouched, when that cannot be done:
     // the disk is full, the folder is missing or read-only, the file itself is not writable. The permissions
-    // of an existing file stay, but for those to write of others than its owner. Any thread.
+    // of an existing file stay, but for those to write of others than its owner. errno says why it cannot be
+    // done. What RefusedWrites kept for the file before is forgotten once this is written. Any thread.
     static bool write(const std::string& path, std::string_view bytes,
                       Durability durability = Durability::Automatic, Links links = Links::Follow);
 

@@ -1,6 +1,7 @@
 #include "support/FileSyncQueue.h"
 
 #include "support/AlternateStack.h"
+#include "support/AtomicFile.h"
 #include "support/HiddenName.h"
 
 #include <cerrno>
@@ -9,12 +10,15 @@
 #include <deque>
 #include <fcntl.h>
 #include <mutex>
+#include <set>
 #include <thread>
 #include <unistd.h>
 #include <unordered_map>
 
 namespace
 {
+
+constexpr std::size_t LARGEST_FILE = 256 * 1024 * 1024; // that this program writes
 
 enum class SyncResult { Done, Missing, Failed };
 
@@ -23,7 +27,8 @@ SyncResult syncOne(const std::string& path, int flags)
     const int descriptor = ::open(path.c_str(), O_RDONLY | O_CLOEXEC | O_NONBLOCK | flags);
     if (descriptor < 0)
         return errno == ENOENT || errno == ENOTDIR ? SyncResult::Missing : SyncResult::Failed;
-    const bool isDone = ::fsync(descriptor) == 0;
+    // Some file systems have nothing to sync.
+    const bool isDone = ::fsync(descriptor) == 0 || errno == EINVAL || errno == ENOTSUP || errno == EROFS;
     ::close(descriptor);
     return isDone ? SyncResult::Done : SyncResult::Failed;
 }
@@ -49,8 +54,10 @@ public:
         const bool isLinked = !kept.empty() && ::link(path.c_str(), kept.c_str()) == 0;
         const bool isKept = isLinked || (!kept.empty() && errno == EEXIST);
         if (std::rename(temporary.c_str(), path.c_str()) != 0) {
+            const int error = errno;
             if (isLinked)
                 ::unlink(kept.c_str());
+            errno = error;
             return false;
         }
         add(path, isKept);
@@ -83,10 +90,39 @@ public:
             add(path, false);
     }
 
+    std::vector<std::string> unsynced()
+    {
+        const std::lock_guard lock(mMutex);
+        std::vector<std::string> paths(mFailed.begin(), mFailed.end());
+        for (const auto& [path, entry] : mEntries)
+            paths.push_back(path);
+        return paths;
+    }
+
+    std::vector<std::string> failed()
+    {
+        const std::lock_guard lock(mMutex);
+        return {mFailed.begin(), mFailed.end()};
+    }
+
+    void forgetFailed(const std::string& path)
+    {
+        const std::lock_guard lock(mMutex);
+        mFailed.erase(path);
+    }
+
+    void setListener(std::function<void()> listener)
+    {
+        const std::lock_guard lock(mMutex);
+        mListener = std::move(listener);
+    }
+
     bool flush(std::chrono::milliseconds deadline)
     {
         std::unique_lock lock(mMutex);
-        return mIdle.wait_for(lock, deadline, [this] { return mEntries.empty() && !mIsDiscarding; });
+        const bool isIdle =
+            mIdle.wait_for(lock, deadline, [this] { return mEntries.empty() && !mIsDiscarding; });
+        return isIdle && mFailed.empty();
     }
 
 private:
@@ -97,6 +133,7 @@ private:
 
     void add(const std::string& path, bool isKept)
     {
+        mFailed.erase(path);
         Entry& entry = mEntries[path];
         if (entry.generation++ == 0)
             mOrder.push_back(path);
@@ -144,6 +181,14 @@ private:
             std::rename(HiddenName::kept(path).c_str(), discarded.c_str());
         }
         mEntries.erase(entry);
+        if (result == SyncResult::Failed) {
+            mFailed.insert(path);
+            if (const std::function<void()> listener = mListener) {
+                lock.unlock();
+                listener();
+                lock.lock();
+            }
+        }
         if (!discarded.empty()) {
             mIsDiscarding = true;
             lock.unlock();
@@ -160,6 +205,8 @@ private:
     std::condition_variable mIdle;
     std::unordered_map<std::string, Entry> mEntries;
     std::deque<std::string> mOrder;
+    std::set<std::string> mFailed;
+    std::function<void()> mListener;
     bool mIsRunning = false;
     bool mIsDiscarding = false;
 };
@@ -184,6 +231,38 @@ void FileSyncQueue::enqueue(const std::string& path)
 void FileSyncQueue::settleKept(const std::string& path, Kept decision)
 {
     Queue::instance().settleKept(path, decision);
+}
+
+bool FileSyncQueue::syncFolder(const std::string& folder)
+{
+    return syncOne(folder, O_DIRECTORY) != SyncResult::Failed;
+}
+
+std::vector<std::string> FileSyncQueue::unsynced()
+{
+    return Queue::instance().unsynced();
+}
+
+bool FileSyncQueue::hasFailed()
+{
+    return !Queue::instance().failed().empty();
+}
+
+void FileSyncQueue::retryFailed()
+{
+    for (const std::string& path : Queue::instance().failed()) {
+        // After a failure the system may count the pages as clean: only new ones are sure to be written.
+        std::string bytes;
+        if (AtomicFile::read(path, LARGEST_FILE, bytes))
+            AtomicFile::write(path, bytes, AtomicFile::Durability::SyncLater);
+        else if (errno == ENOENT || errno == ENOTDIR)
+            Queue::instance().forgetFailed(path);
+    }
+}
+
+void FileSyncQueue::setListener(std::function<void()> listener)
+{
+    Queue::instance().setListener(std::move(listener));
 }
 
 bool FileSyncQueue::flush(std::chrono::milliseconds deadline)

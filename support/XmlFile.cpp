@@ -1,7 +1,7 @@
 #include "support/XmlFile.h"
 
 #include "support/AtomicFile.h"
-#include "support/FileSyncQueue.h"
+#include "support/RefusedWrites.h"
 #include "support/XmlFileGuard.h"
 
 #include <cstdio>
@@ -168,7 +168,9 @@ private:
 bool XmlFile::load(const std::string& path, TiXmlDocument& document)
 {
     std::string bytes;
-    if (!AtomicFile::read(path, XmlFileGuard::MAX_BYTES, bytes) || !XmlFileGuard::accepts(bytes))
+    if (!RefusedWrites::find(path, bytes) && !AtomicFile::read(path, XmlFileGuard::MAX_BYTES, bytes))
+        return false;
+    if (!XmlFileGuard::accepts(bytes))
         return false;
     normaliseLineEnds(bytes);
     document.Clear();
@@ -183,19 +185,6 @@ bool XmlFile::load(const std::string& path, TiXmlDocument& document)
 bool XmlFile::save(const TiXmlDocument& document, const std::string& path)
 {
     return AtomicFile::write(path, toBytes(document));
-}
-
-bool XmlFile::saveInPlace(const TiXmlDocument& document, const std::string& path)
-{
-    const std::string bytes = toBytes(document);
-    std::FILE* const file = std::fopen(path.c_str(), "we");
-    if (!file)
-        return false;
-    const bool isWritten = std::fwrite(bytes.data(), 1, bytes.size(), file) == bytes.size();
-    if (std::fclose(file) != 0 || !isWritten)
-        return false;
-    FileSyncQueue::enqueue(path);
-    return true;
 }
 
 std::string XmlFile::toBytes(const TiXmlDocument& document)

@@ -10,16 +10,13 @@ class XmlFile
 public:
     // Loads a file as TiXmlDocument::LoadFile with TIXML_ENCODING_UNKNOWN does, line ends included, and names
     // the document after it. False for what is missing, no plain file, refused by XmlFileGuard, or not XML;
-    // the document is then not to be used. Any thread.
+    // the document is then not to be used. Bytes that the disk refused to take (RefusedWrites) are read in
+    // place of the file. Any thread.
     static bool load(const std::string& path, TiXmlDocument& document);
 
     // Replaces the file by the bytes that TiXmlDocument::SaveFile writes, aside and renamed as AtomicFile
-    // does.
+    // does. False, with the old file untouched, when the disk refuses.
     static bool save(const TiXmlDocument& document, const std::string& path);
-
-    // Writes to the file itself, for the one whose readers must rather find no file than an old one. Cut off,
-    // it leaves a part.
-    static bool saveInPlace(const TiXmlDocument& document, const std::string& path);
 
     // The bytes that SaveFile writes.
     static std::string toBytes(const TiXmlDocument& document);

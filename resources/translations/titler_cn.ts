@@ -169,6 +169,29 @@
     </message>
 </context>
 <context>
+    <name>LossDescription</name>
+    <message>
+        <source>Not saved: %1</source>
+        <translation>未保存：%1</translation>
+    </message>
+    <message>
+        <source>the title &quot;%1&quot;</source>
+        <translation>字幕“%1”</translation>
+    </message>
+    <message>
+        <source>the order of the titles in &quot;%1&quot;</source>
+        <translation>“%1”中字幕的顺序</translation>
+    </message>
+    <message>
+        <source>the pictures of &quot;%1&quot;</source>
+        <translation>“%1”的图片</translation>
+    </message>
+    <message>
+        <source>%1 more</source>
+        <translation>另外 %1 项</translation>
+    </message>
+</context>
+<context>
     <name>RangeOfMoveText</name>
     <message>
         <source>Range of move per 1 tap</source>
@@ -181,6 +204,20 @@
     <message>
         <source>10px</source>
         <translation>10px</translation>
+    </message>
+</context>
+<context>
+    <name>SaveOutage</name>
+    <message>
+        <source>File</source>
+        <translation>文件</translation>
+    </message>
+</context>
+<context>
+    <name>SavingNotice</name>
+    <message>
+        <source>Saving...</source>
+        <translation>正在保存…</translation>
     </message>
 </context>
 <context>

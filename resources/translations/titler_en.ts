@@ -169,6 +169,29 @@
     </message>
 </context>
 <context>
+    <name>LossDescription</name>
+    <message>
+        <source>Not saved: %1</source>
+        <translation>Not saved: %1</translation>
+    </message>
+    <message>
+        <source>the title &quot;%1&quot;</source>
+        <translation>the title &quot;%1&quot;</translation>
+    </message>
+    <message>
+        <source>the order of the titles in &quot;%1&quot;</source>
+        <translation>the order of the titles in &quot;%1&quot;</translation>
+    </message>
+    <message>
+        <source>the pictures of &quot;%1&quot;</source>
+        <translation>the pictures of &quot;%1&quot;</translation>
+    </message>
+    <message>
+        <source>%1 more</source>
+        <translation>%1 more</translation>
+    </message>
+</context>
+<context>
     <name>RangeOfMoveText</name>
     <message>
         <source>Range of move per 1 tap</source>
@@ -181,6 +204,20 @@
     <message>
         <source>10px</source>
         <translation>10px</translation>
+    </message>
+</context>
+<context>
+    <name>SaveOutage</name>
+    <message>
+        <source>File</source>
+        <translation>File</translation>
+    </message>
+</context>
+<context>
+    <name>SavingNotice</name>
+    <message>
+        <source>Saving...</source>
+        <translation>Saving...</translation>
     </message>
 </context>
 <context>

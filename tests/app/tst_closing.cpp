@@ -14,6 +14,7 @@
 #include "library/ArchiveList.h"
 #include "library/ArchiveMenu.h"
 #include "messaging/services/FileManagerControllerParams.h"
+#include "support/FileSyncQueue.h"
 #include "touchui/KSInputContext.h"
 
 #include <QApplication>
@@ -24,6 +25,7 @@
 #include <QTest>
 #include <QTextCursor>
 #include <QThread>
+#include <chrono>
 
 namespace
 {
@@ -301,6 +303,7 @@ void tst_Closing::verifyAnswer(Ending ending)
 
 void tst_Closing::verifyDisk()
 {
+    QVERIFY(FileSyncQueue::flush(std::chrono::seconds(30))); // the versions before are kept until then
     QCOMPARE(LibraryFixture::order(mFolder), mOrder);
     QSet<QString> known{".order.xml"};
     for (const QString& stem : std::as_const(mOrder)) {

@@ -44,6 +44,7 @@ private Q_SLOTS:
     void deleteSelectedLeavesEmptyOnes();
     void savesAtOnce();
     void picturesFollowTheTitle();
+    void missingPictureIsMadeAgain();
     void withoutRender();
     void backgroundBrush();
     void safeArea();
@@ -670,6 +671,33 @@ void tst_canvasscene::picturesFollowTheTitle()
     QVERIFY(canvas.scene->isEditFinish());
     canvas.log.finished = false;
     QVERIFY(!canvas.scene->isEditFinish());
+}
+
+void tst_canvasscene::missingPictureIsMadeAgain()
+{
+    Canvas canvas;
+    const QStringList names{"t_1920.png", "t_960.png", "t_240.png", "t_240S.png"};
+    canvas.title.setThumbnailBig(names.at(0).toStdString());
+    canvas.title.setThumbnailMiddle(names.at(1).toStdString());
+    canvas.title.setThumbnailSmall(names.at(2).toStdString());
+    canvas.title.setThumbnailBlack(names.at(3).toStdString());
+    QVERIFY(TitleParser().writeOneTitle(&canvas.title) == 1);
+    for (const QString& name : names)
+        QVERIFY(QImage(4, 4, QImage::Format_RGB32).save(canvas.folder.filePath(name)));
+    canvas.open({makeRecord("a")});
+    QCOMPARE(canvas.log.slow, 0);
+    for (const QString& name : names) {
+        QVERIFY(QFile::remove(canvas.folder.filePath(name)));
+        canvas.log.slow = 0;
+        canvas.open({makeRecord("a")});
+        QCOMPARE(canvas.log.slow, 1);
+        QVERIFY(QImage(4, 4, QImage::Format_RGB32).save(canvas.folder.filePath(name)));
+    }
+    // Names that lead elsewhere are nobody's pictures.
+    canvas.log.slow = 0;
+    canvas.title.setThumbnailBig("../elsewhere.png");
+    canvas.open({makeRecord("a")});
+    QCOMPARE(canvas.log.slow, 0);
 }
 
 void tst_canvasscene::withoutRender()

@@ -13,6 +13,7 @@
 #include <QTemporaryDir>
 #include <QXmlStreamReader>
 #include <QtTest/QTest>
+#include <cerrno>
 #include <clocale>
 #include <memory>
 #include <stdexcept>
@@ -190,11 +191,12 @@ private Q_SLOTS:
         QCOMPARE(mParser.readOneTitle(path("missing.xml"), &archive), 0);
         QVERIFY(archive.getPath().empty());
         QCOMPARE(mParser.readOneTitle(path("missing.xml"), nullptr), 0);
-        // A save that the disk refuses is not reported.
         archive.setPath(path("no/folder.xml"));
-        QCOMPARE(mParser.writeOneTitle(&archive), 1);
+        QCOMPARE(mParser.writeOneTitle(&archive), -1);
+        QCOMPARE(errno, ENOENT);
         archive.setPath("/dev/full");
-        QCOMPARE(mParser.writeOneTitle(&archive), 1);
+        QCOMPARE(mParser.writeOneTitle(&archive), -1);
+        QCOMPARE(errno, ENOSPC);
     }
 
     void rootOfAnyName()
@@ -488,7 +490,7 @@ private Q_SLOTS:
         QCOMPARE(rows[1]->getArchivePath(), std::string("é 中.xml"));
         QVERIFY(rows[2]->getArchivePath().empty());
         qDeleteAll(rows);
-        QCOMPARE(mParser.writeFileOrderInFolder(folder() + "/missing", {}), 1);
+        QCOMPARE(mParser.writeFileOrderInFolder(folder() + "/missing", {}), -1);
         QCOMPARE(mParser.writeFileOrderInFolder(folder(), {}), 1);
         QVERIFY(read(".order.xml").contains("index-count=\"0\""));
     }

@@ -1,4 +1,6 @@
 """A titler that is killed at any moment of its work."""
+import os
+import signal
 import unittest
 
 import harness
@@ -40,6 +42,20 @@ class Killed(MortalTitler, harness.TitlerTest):
                 self.wait_no_leftovers(folder)
                 self.assertEqual(len(self.titles(folder)), len(titles))
                 self.assertEqual(wire.broken_files(self.base), {})
+
+    def test_leftovers_are_swept_in_every_folder(self):
+        resources = os.path.join(self.base, "resources")
+        folders = [self.folder(), os.path.join(self.base, "resources", "Titles"), os.path.join(resources, "Templates")]
+        folders += [os.path.join(resources, "Templates", "templates_" + name) for name in ("en", "chs")]
+        self.titler.signal(signal.SIGKILL)
+        self.assertEqual(self.titler.wait(10), -signal.SIGKILL)
+        made = []
+        for folder in folders:
+            made.append(os.path.join(folder, ".titler-new-1-1-1"))  # of a process that has gone
+            with open(made[-1], "w", encoding="ascii") as stream:
+                stream.write("half")
+        self.start_titler()
+        self.assertEqual([path for path in made if os.path.exists(path)], [])
 
 
 if __name__ == "__main__":

@@ -76,7 +76,7 @@ class TitleList(LibraryTest):
         self.wait_order(original)
         self.close_window()
         self.assertEqual(self.order(), original)
-        self.assert_no_leftovers(self.long)
+        self.wait_no_leftovers(self.long)
 
     def test_held_titles_are_copied_and_deleted(self):
         self.choose_in_list_menu(0, "Copy")

@@ -102,8 +102,8 @@ public:
         return archive;
     }
 
-    // Writes title files of these stems, each showing its stem as text, with small pictures and an order
-    // file.
+    // Writes title files of these stems, each showing its stem as text, with a red picture in place of each
+    // of the four, and an order file.
     static void fillFolder(const QString& folder, const QStringList& stems)
     {
         ArchiveController controller;
@@ -112,7 +112,8 @@ public:
             controller.saveNewArchive(folder, archive.get());
             QImage small(240, 135, QImage::Format_ARGB32);
             small.fill(Qt::red);
-            small.save(folder + QLatin1Char('/') + stem + QStringLiteral("_240.png"));
+            for (const char* suffix : {"_240.png", "_240S.png", "_960.png", "_1920.png"})
+                small.save(folder + QLatin1Char('/') + stem + QLatin1String(suffix));
         }
         writeOrder(folder, stems);
     }

@@ -29,6 +29,7 @@ private Q_SLOTS:
     void pastedTitleHasTheBackgroundOfItsFile();
     void deletedTitleLeavesTheCanvas();
     void deletedTitleLeavesNoPictures();
+    void picturesFollowTheirFolder();
     void picturesShowWhatTheCanvasShows();
 
 private:
@@ -148,7 +149,7 @@ void tst_ListAndCanvas::leavingATextThatIsTypedWritesItsPictures()
     // The other was only looked at.
     mList->selectArchive(0);
     QVERIFY(mScene->isEditFinish());
-    QVERIFY(!QFile::exists(folder + QStringLiteral("/b_1920.png")));
+    QCOMPARE(QImage(folder + QStringLiteral("/b_1920.png")).size(), QSize(240, 135)); // as it was
 }
 
 // It is decoded while the copy is held, so a file that changes in between must be noticed.
@@ -219,11 +220,45 @@ void tst_ListAndCanvas::deletedTitleLeavesNoPictures()
     QVERIFY(gone != kept);
     mStack->undo();
     mList->synchronizationFolderFile();
-    reporter.goOn.release(2);
+    reporter.goOn.release(1000);
     QTRY_VERIFY_WITH_TIMEOUT(mScene->isEditFinish(), 20000);
     QCOMPARE(QDir(folder).entryList({gone + QLatin1Char('*')}, QDir::Files), QStringList());
     for (const char* suffix : {".xml", "_1920.png", "_960.png", "_240.png", "_240S.png"})
         QVERIFY(QFile::exists(folder + QLatin1Char('/') + kept + QLatin1String(suffix)));
+}
+
+// Another process gives the open folder a new name while pictures are on their way; its notice comes later.
+void tst_ListAndCanvas::picturesFollowTheirFolder()
+{
+    const QString before = mFixture.makeFolder(QStringLiteral("before"));
+    const QString after = before + QStringLiteral(" and after");
+    QDir(after).removeRecursively();
+    {
+        HoldingReporter reporter;
+        mList->refreshArchiveList(before);
+        createTitle(QStringLiteral("One"));
+        mScene->slotMakeSceneThumnail();
+        // The thread is busy with it.
+        QTRY_COMPARE_WITH_TIMEOUT(reporter.reached.available(), 1, 20000);
+        createTitle(QStringLiteral("Two"));
+        createTitle(QStringLiteral("Three"));
+        mScene->slotMakeSceneThumnail();
+        QVERIFY(QDir().rename(before, after));
+        reporter.goOn.release(1000);
+        QTRY_VERIFY_WITH_TIMEOUT(mScene->isEditFinish(), 20000); // those that went into the void
+        createTitle(QStringLiteral("lost with the folder"));
+        mList->refreshArchiveListForChangeFolderName(before, after);
+        QTRY_VERIFY_WITH_TIMEOUT(mScene->isEditFinish(), 20000);
+    }
+    QVERIFY(!QFileInfo::exists(before));
+    const QStringList titles = QDir(after).entryList({QStringLiteral("*.xml")}, QDir::Files);
+    QCOMPARE(titles.size(), 3);
+    for (const QString& title : titles) {
+        for (const char* suffix : {"_1920.png", "_960.png", "_240.png", "_240S.png"}) {
+            const QString picture = after + QLatin1Char('/') + title.chopped(4) + QLatin1String(suffix);
+            QTRY_VERIFY2_WITH_TIMEOUT(!QImage(picture).isNull(), qPrintable(picture), 20000);
+        }
+    }
 }
 
 void tst_ListAndCanvas::picturesShowWhatTheCanvasShows()

@@ -1,4 +1,5 @@
 // The pictures of a title: sizes, places, transparency and when each stage runs.
+#include "../support/FullDisk.h"
 #include "../support/LogFixture.h"
 #include "LibraryFixture.h"
 
@@ -43,9 +44,9 @@ private Q_SLOTS:
     void missingBackgroundIsPassedOver();
     void hugeBackgroundGivesPicturesOfTheUsualSize();
     void slowStageWritesFourFiles();
-    void slowStageRemovesTheOldBigPicture();
-    void slowStageRemovesNothingElse_data();
-    void slowStageRemovesNothingElse();
+    void slowStageReplacesTheOldBigPicture();
+    void slowStageReplacesNothingElse_data();
+    void slowStageReplacesNothingElse();
     void slowStageDrawsWhileTheEventsGoOn();
     void waitingWithoutEventsDrawsWhatIsLeft();
     void textsStandAtOneAndAHalfTimesTheirPlace();
@@ -256,15 +257,24 @@ void tst_ThumbnailRender::slowStageWritesFourFiles()
     }
 }
 
-void tst_ThumbnailRender::slowStageRemovesTheOldBigPicture()
+void tst_ThumbnailRender::slowStageReplacesTheOldBigPicture()
 {
     const QString folder = mFixture.makeFolder(QStringLiteral("old"));
     const auto archive = LibraryFixture::makeRecord(folder, QStringLiteral("t"), QString());
-    paint(folder + QStringLiteral("/t_1920.png"), QSize(10, 10), Qt::red);
+    const QString picture = folder + QStringLiteral("/t_1920.png");
+    paint(picture, QSize(10, 10), Qt::red);
+    {
+        ThumbnailRender render;
+        const FullDisk disk;
+        render.makeThumbnail(archive.get(), true);
+        QCOMPARE(QImage(picture).size(), QSize(10, 10)); // on air until the new one is there
+        QTRY_VERIFY_WITH_TIMEOUT(render.makePictureThreadIsFinished(), 20000);
+        QCOMPARE(QImage(picture).size(), QSize(10, 10));
+    }
     QCOMPARE(slowPicture(*archive, "_1920.png").size(), QSize(1920, 1080));
 }
 
-void tst_ThumbnailRender::slowStageRemovesNothingElse_data()
+void tst_ThumbnailRender::slowStageReplacesNothingElse_data()
 {
     QTest::addColumn<QString>("name");
     QTest::newRow("of another folder") << "../neighbour/x.png";
@@ -275,7 +285,7 @@ void tst_ThumbnailRender::slowStageRemovesNothingElse_data()
     QTest::newRow("the order") << ".order.xml";
 }
 
-void tst_ThumbnailRender::slowStageRemovesNothingElse()
+void tst_ThumbnailRender::slowStageReplacesNothingElse()
 {
     QFETCH(QString, name);
     const QString neighbour = mFixture.makeFolder(QStringLiteral("neighbour"));

@@ -1,0 +1,130 @@
+#include "canvas/SaveOutage.h"
+
+#include "canvas/MessageBoxController.h"
+#include "document/ITitleChangeReporter.h"
+#include "support/FileSyncQueue.h"
+#include "support/LogManager.h"
+#include "support/RefusedWrites.h"
+
+#include <QFileInfo>
+#include <QString>
+#include <algorithm>
+#include <cstring>
+
+namespace
+{
+
+const int LOG_NUMBER = 400;
+
+void log(const std::string& text)
+{
+    LOG_DEBUG_OPERATE(L"SaveOutage", LOG_NUMBER, QString::fromStdString(text).toStdWString());
+}
+
+bool hasFolder(const RefusedWrites::File& file)
+{
+    return QFileInfo(QFileInfo(QString::fromStdString(file.path)).path()).isDir();
+}
+
+// The file manager is told of pictures when they are in their place.
+void reportPictures(const std::vector<RefusedWrites::File>& written)
+{
+    std::set<std::string> titles;
+    for (const RefusedWrites::File& file : written) {
+        if (!file.title.empty())
+            titles.insert(file.title);
+    }
+    if (ITitleChangeReporter* reporter = ITitleChangeReporter::instance()) {
+        for (const std::string& title : titles)
+            reporter->changeTitlerStatus(FileManagerDefine::TITLE_PICTURES_CHANGED,
+                                         QString::fromStdString(title));
+    }
+}
+
+} // namespace
+
+SaveOutage* SaveOutage::instance()
+{
+    static SaveOutage* const outage = new SaveOutage; // threads may report to it until the process ends
+    return outage;
+}
+
+SaveOutage::SaveOutage()
+{
+    mTimer.setInterval(RETRY_INTERVAL);
+    connect(&mTimer, &QTimer::timeout, this, &SaveOutage::retryLater);
+    const auto listener = [this] {
+        QMetaObject::invokeMethod(this, &SaveOutage::begin, Qt::QueuedConnection);
+    };
+    RefusedWrites::setListener(listener);
+    FileSyncQueue::setListener(listener);
+}
+
+void SaveOutage::begin()
+{
+    mHasSyncFailed = mHasSyncFailed || FileSyncQueue::hasFailed();
+    if (isOver())
+        return;
+    if (!mTimer.isActive())
+        mTimer.start();
+    logRefused();
+    tell(FoldersAway::Pardoned);
+}
+
+bool SaveOutage::retry()
+{
+    reportPictures(RefusedWrites::retry());
+    FileSyncQueue::retryFailed();
+    if (isOver())
+        end();
+    return RefusedWrites::isEmpty();
+}
+
+void SaveOutage::retryLater()
+{
+    retry();
+    if (!isOver())
+        tell(FoldersAway::Told);
+}
+
+bool SaveOutage::isOver()
+{
+    return RefusedWrites::isEmpty() && (!mHasSyncFailed || FileSyncQueue::unsynced().empty());
+}
+
+void SaveOutage::end()
+{
+    if (mIsTold)
+        log("the disk takes again what is saved");
+    mTimer.stop();
+    mLogged.clear();
+    mIsTold = false;
+    mHasSyncFailed = false;
+}
+
+void SaveOutage::tell(FoldersAway foldersAway)
+{
+    MessageBoxController* const messages = MessageBoxController::getInstance();
+    if (mIsTold || !messages)
+        return;
+    const std::vector<RefusedWrites::File> files = RefusedWrites::files();
+    if (foldersAway == FoldersAway::Pardoned && !mHasSyncFailed &&
+        std::none_of(files.begin(), files.end(), hasFolder))
+        return;
+    mIsTold = true;
+    messages->postMessage(MessageDef::MESSAGE_DISK_FULL_ON_CREATE, tr("File"));
+}
+
+void SaveOutage::logRefused()
+{
+    for (const RefusedWrites::File& file : RefusedWrites::files()) {
+        if (mLogged.insert(file.path).second)
+            log("cannot write " + file.path + ": " + std::strerror(file.error));
+    }
+    if (!mHasSyncFailed)
+        return;
+    for (const std::string& path : FileSyncQueue::unsynced()) {
+        if (mLogged.insert(path).second)
+            log("cannot sync " + path);
+    }
+}

@@ -1,0 +1,144 @@
+// What becomes of an edit that the disk refuses.
+#include "../support/FullDisk.h"
+#include "CanvasFixture.h"
+
+#include "support/RefusedWrites.h"
+
+namespace
+{
+
+constexpr int RETRY_TIMEOUT = 15000; // ms; refused writes are tried again every 5 s
+
+using Posted = QList<QPair<int, QString>>;
+
+} // namespace
+
+class tst_CanvasSceneFullDisk : public QObject
+{
+    Q_OBJECT
+
+private Q_SLOTS:
+    void initTestCase()
+    {
+        MessageBoxController::setProvider([]() -> MessageBoxController* { return messages; }, [] {});
+    }
+    void init() { messages = new FakeMessages; }
+    void cleanup()
+    {
+        delete messages;
+        messages = nullptr;
+        for (const RefusedWrites::File& file : RefusedWrites::files())
+            RefusedWrites::forget(file.path);
+    }
+    void refusedEditIsToldOnceAndSavedWhenThereIsRoom();
+    void refusedEditIsSavedWithTheNextChange();
+    void refusedEditIsWhatIsReadAgain();
+    void refusedEditFollowsItsFolder();
+
+private:
+    static QString onDisk(const QString& path)
+    {
+        QFile file(path);
+        return file.open(QIODevice::ReadOnly) ? QString::fromUtf8(file.readAll()) : QString();
+    }
+    static void type(Canvas& canvas, const QString& text)
+    {
+        TText changed = *canvas.text(1)->getItemTText();
+        canvas.text(1)->setTextInteractionFlags(Qt::TextEditorInteraction);
+        QTextCursor cursor = canvas.text(1)->textCursor();
+        cursor.movePosition(QTextCursor::End);
+        cursor.insertText(text);
+        canvas.scene->clearItemsSelectionAndFocus();
+        canvas.scene->saveArchive();
+    }
+    static bool hasText(const QString& path, const QString& text)
+    {
+        Archive title;
+        return TitleParser().readOneTitle(path.toStdString(), &title) == 1 && title.text().size() == 1 &&
+               title.text().front()->getText() == text.toStdString();
+    }
+};
+
+void tst_CanvasSceneFullDisk::refusedEditIsToldOnceAndSavedWhenThereIsRoom()
+{
+    Canvas canvas;
+    const QString path = canvas.folder.filePath("title.xml");
+    canvas.open({makeRecord("a")});
+    canvas.scene->saveArchive();
+    const QString before = onDisk(path);
+    QVERIFY(!before.isEmpty());
+    {
+        const FullDisk disk;
+        type(canvas, "b");
+        QTRY_COMPARE(messages->posted, (Posted{{114, "File"}}));
+        type(canvas, "c");
+        QCOMPARE(onDisk(path), before);
+    }
+    // Nobody does anything.
+    QTRY_VERIFY_WITH_TIMEOUT(onDisk(path) != before, RETRY_TIMEOUT);
+    QVERIFY(hasText(path, "abc"));
+    QCOMPARE(messages->posted, (Posted{{114, "File"}}));
+    QVERIFY(RefusedWrites::isEmpty());
+    {
+        const FullDisk disk;
+        type(canvas, "d");
+        QTRY_COMPARE(messages->posted.size(), 2); // the next outage
+    }
+}
+
+void tst_CanvasSceneFullDisk::refusedEditIsSavedWithTheNextChange()
+{
+    Canvas canvas;
+    const QString first = canvas.folder.filePath("title.xml");
+    canvas.open({makeRecord("a")});
+    canvas.scene->saveArchive();
+    {
+        const FullDisk disk;
+        type(canvas, "b");
+    }
+    // In another title.
+    canvas.title.setPath(canvas.folder.filePath("other.xml").toStdString());
+    canvas.open({makeRecord("x")});
+    type(canvas, "y");
+    QVERIFY(onDisk(first).contains("text=\"ab\"") || hasText(first, "ab"));
+    QVERIFY(RefusedWrites::isEmpty());
+    QVERIFY(hasText(canvas.folder.filePath("other.xml"), "xy"));
+}
+
+// The list reads a title anew after each save.
+void tst_CanvasSceneFullDisk::refusedEditIsWhatIsReadAgain()
+{
+    Canvas canvas;
+    const QString path = canvas.folder.filePath("title.xml");
+    canvas.open({makeRecord("a")});
+    canvas.scene->saveArchive();
+    const FullDisk disk;
+    type(canvas, "b");
+    QVERIFY(!onDisk(path).contains("ab"));
+    QVERIFY(hasText(path, "ab"));
+    RefusedWrites::forget(path.toStdString());
+    QVERIFY(hasText(path, "a"));
+}
+
+void tst_CanvasSceneFullDisk::refusedEditFollowsItsFolder()
+{
+    Canvas canvas;
+    const QString before = canvas.folder.filePath("before");
+    const QString after = canvas.folder.filePath("after");
+    QVERIFY(QDir().mkdir(before));
+    canvas.title.setPath((before + "/title.xml").toStdString());
+    canvas.open({makeRecord("a")});
+    canvas.scene->saveArchive();
+    {
+        const FullDisk disk;
+        type(canvas, "b");
+        QVERIFY(QDir().rename(before, after));
+        canvas.scene->folderRenamed(before, after);
+    }
+    QTRY_VERIFY_WITH_TIMEOUT(RefusedWrites::isEmpty(), RETRY_TIMEOUT);
+    QVERIFY(hasText(after + "/title.xml", "ab"));
+    QVERIFY(!QFileInfo::exists(before));
+}
+
+QTEST_MAIN(tst_CanvasSceneFullDisk)
+#include "tst_canvasscene_fulldisk.moc"
