@@ -262,13 +262,14 @@ void TitlerWindow::showDialogMaskWidget(bool show)
 {
     if (show && !WINDOW_IS_SHOWN)
         return;
-    if (!mDialogMask) {
+    if (!mDialogMask && show) {
         mDialogMask = createMask();
         mDialogMask->setParent(this);
         mDialogMask->setGeometry(rect());
         mDialogMask->raise();
     }
-    mDialogMask->setVisible(show);
+    if (mDialogMask)
+        mDialogMask->setVisible(show);
     setAttribute(Qt::WA_AcceptTouchEvents, !show);
     if (!show || mTextToolsPanel->colorPaletteIsShown())
         mTextToolsPanel->showDialogMaskWidget(show);
@@ -283,13 +284,14 @@ void TitlerWindow::showMessageMaskWidget(bool show)
 {
     if (show && !WINDOW_IS_SHOWN)
         return;
-    if (!mMessageMask) {
+    if (!mMessageMask && show) {
         mMessageMask = createMask();
         mMessageMask->setParent(this);
         mMessageMask->setGeometry(rect());
         mMessageMask->raise();
     }
-    mMessageMask->setVisible(show);
+    if (mMessageMask)
+        mMessageMask->setVisible(show);
     const bool isDialogMasked = mDialogMask && !mDialogMask->isHidden();
     setAttribute(Qt::WA_AcceptTouchEvents, !show && !isDialogMasked);
     if (!show || mTextToolsPanel->colorPaletteIsShown())

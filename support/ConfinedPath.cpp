@@ -20,9 +20,11 @@ namespace
 constexpr int REFUSAL_NUMBER = 400;
 constexpr std::size_t REMEMBERED_REFUSALS = 256;
 
-constexpr std::array<FolderLookup::Getter, 3> TITLE_ROOTS{&IPathManagerEx::getTitleResourcesPath,
-                                                          &IPathManagerEx::getTemplatesPath,
-                                                          &IPathManagerEx::getTitlerTemplatesPath};
+// Templates go first: to ask for a folder makes it, and whoever fills the data path writes the templates
+// before there is a folder of titles.
+constexpr std::array<FolderLookup::Getter, 3> TITLE_ROOTS{&IPathManagerEx::getTemplatesPath,
+                                                          &IPathManagerEx::getTitlerTemplatesPath,
+                                                          &IPathManagerEx::getTitleResourcesPath};
 
 std::string currentFolder()
 {

@@ -225,7 +225,6 @@ void tst_titler_window::pathsOutsideHideAgain_data()
     QTest::newRow("link to a title of ours") << "%1/elsewhere/ours.xml";
     QTest::newRow("root") << "%2";
     QTest::newRow("beside the root") << "%2 2/foreign";
-    QTest::newRow("relative") << "titles/news";
 }
 
 void tst_titler_window::pathsOutsideHideAgain()

@@ -224,7 +224,7 @@ void tst_ThumbnailRender::hugeBackgroundGivesPicturesOfTheUsualSize()
     const auto archive = LibraryFixture::makeRecord(folder, QStringLiteral("t"), QStringLiteral("Huge"));
     archive->setBgResource("bg.png");
     archive->setBgResourceBig("bg.png");
-    paint(folder + QStringLiteral("/bg.png"), QSize(20000, 1200), Qt::blue);
+    paint(folder + QStringLiteral("/bg.png"), QSize(8192, 1200), Qt::blue);
     ThumbnailRender render;
     const QImage fast = fastPicture(render, *archive);
     QCOMPARE(fast.size(), QSize(240, 135));
@@ -232,6 +232,9 @@ void tst_ThumbnailRender::hugeBackgroundGivesPicturesOfTheUsualSize()
     const QImage big = slowPicture(*archive, "_1920.png");
     QCOMPARE(big.size(), QSize(1920, 1080));
     QCOMPARE(big.pixelColor(1917, 1077), QColor(Qt::blue));
+    // One that is too large is as good as none.
+    paint(folder + QStringLiteral("/bg.png"), QSize(8193, 10), Qt::blue);
+    QCOMPARE(fastPicture(render, *archive).pixelColor(237, 132).alpha(), 0);
 }
 
 void tst_ThumbnailRender::slowStageWritesFourFiles()

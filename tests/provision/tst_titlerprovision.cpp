@@ -5,6 +5,7 @@
 #include "document/Archive.h"
 #include "document/TText.h"
 #include "document/TitleParser.h"
+#include "support/IPathManagerEx.h"
 
 #include <QDirIterator>
 #include <QFile>
@@ -70,6 +71,7 @@ double meanDifference(const QByteArray& one, const QByteArray& two)
 QString useDataPath(const QTemporaryDir& dir)
 {
     qputenv("K2SYS_AC_DATA", dir.path().toLocal8Bit());
+    IPathManagerEx::clearUp(); // what it knows of the folders is about the path before
     return TitlerProvision::basePathOfEnvironment();
 }
 
