@@ -129,6 +129,7 @@ void TextStyleEditor::documentChanged(int position, int removed, int added)
     removed = std::clamp(removed, 0, std::max(m_styles.count() - position, 0));
     added = std::max(documentLength(*m_item.document()) - (m_styles.count() - removed), 0);
     added = cutOffCharsBeyondMaxNum(position, added);
+    trimUnchanged(position, removed, added);
     if (removed == 0 && added == 0)
         return;
 
@@ -181,6 +182,28 @@ int TextStyleEditor::cutOffCharsBeyondMaxNum(int position, int added)
     finishLayout();
     updateWidthAndAlign(m_lastWidth);
     return std::max(added - (end - begin), 0);
+}
+
+// With every event of an input method the document reports the whole paragraph, whose characters are the same
+// but for what was committed. They would lose their styles.
+void TextStyleEditor::trimUnchanged(int& position, int& removed, int& added) const
+{
+    const QTextBlock block = m_item.document()->findBlock(position);
+    if (removed == 0 || added == 0 || position != block.position() || added < block.length() - 1)
+        return;
+    const QString text = m_item.toPlainText();
+    const auto isSame = [&](int style, int character) {
+        return m_styles.at(style)->getText() == StyleDocument::storedText(text, character).toStdString();
+    };
+    while (removed > 0 && added > 0 && isSame(position, position)) {
+        ++position;
+        --removed;
+        --added;
+    }
+    while (removed > 0 && added > 0 && isSame(position + removed - 1, position + added - 1)) {
+        --removed;
+        --added;
+    }
 }
 
 void TextStyleEditor::replaceCharacters(int position, int removed, int added)

@@ -56,6 +56,8 @@ private:
     void insertRecord();
     void applyFormats(int begin, int end);
     int cutOffCharsBeyondMaxNum(int position, int added);
+    // Leaves out of a reported change what is as it was.
+    void trimUnchanged(int& position, int& removed, int& added) const;
     void replaceCharacters(int position, int removed, int added);
     void charsAddedChange(int position, int added);
     void charsRemovedChange(int position, int count);
