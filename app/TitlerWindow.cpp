@@ -364,6 +364,7 @@ void TitlerWindow::showEvent(QShowEvent* event)
 
 void TitlerWindow::hideEvent(QHideEvent* event)
 {
+    mCanvasScene->endPreview(); // the palette is a window of its own
     WINDOW_IS_SHOWN = false;
     QMainWindow::hideEvent(event);
 }

@@ -135,6 +135,7 @@ void TextStyleEditor::documentChanged(int position, int removed, int added)
 
     m_item.touchEditor().clearHandleCaret();
     m_undoFlag = 1;
+    const bool previewTakenBack = m_styles.takeBackPreview(); // new characters do not take it over
     if (removed > 0 && added > 0) {
         replaceCharacters(position, removed, added);
     } else {
@@ -145,6 +146,10 @@ void TextStyleEditor::documentChanged(int position, int removed, int added)
             charsAddedChange(position, added);
     }
     reconcile();
+    if (previewTakenBack) {
+        const Guard guard(*this);
+        applyFormats(0, m_styles.count());
+    }
     showCurrentTextStyle();
     m_item.touchEditor().clearHandleCaret();
 }
@@ -383,6 +388,7 @@ void TextStyleEditor::changeAllStyleWhenSelectionMode(const TText& source, int i
 void TextStyleEditor::changeAllStyleWhenHasSelection(const TText& source, int id)
 {
     pushLastEditTextIntoStack();
+    cancelPreview();
     const Guard guard(*this);
     TText before = m_styles.current();
     TText beforeLast = m_styles.lastAlpha();
@@ -405,6 +411,10 @@ void TextStyleEditor::changeAllStyleWhenHasSelection(const TText& source, int id
 void TextStyleEditor::changePartStyleWhenHasSelection(const TText& source, int id, int undoFlag)
 {
     pushLastEditTextIntoStack();
+    if (undoFlag == PreviewedChange)
+        m_styles.markPreviewStart();
+    else
+        cancelPreview(); // the step of undo leads from before the preview to this change
     m_undoFlag = undoFlag;
     const QTextCursor cursor = m_item.textCursor();
     const Guard guard(*this);
@@ -412,12 +422,24 @@ void TextStyleEditor::changePartStyleWhenHasSelection(const TText& source, int i
     TText beforeLast = m_styles.lastAlpha();
     changeSelectionProperty(id, source, cursor.anchor(), cursor.position());
     applyShadow();
-    if (undoFlag == 1) {
+    if (undoFlag == CommittedChange) {
         emitEdited(before, beforeLast);
         m_styles.refreshUndoBaseline();
     }
     m_styles.forgetNextInsert();
     m_item.update();
+}
+
+void TextStyleEditor::cancelPreview()
+{
+    if (!m_styles.takeBackPreview())
+        return;
+    const Guard guard(*this);
+    applyFormats(0, m_styles.count());
+    updateWidthAndAlign(m_lastWidth);
+    applyShadow();
+    m_undoFlag = CommittedChange;
+    m_styles.refreshUndoBaseline();
 }
 
 void TextStyleEditor::changeSelectionProperty(int id, const TText& source, int from, int to)

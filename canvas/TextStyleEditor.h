@@ -27,6 +27,8 @@ public:
     void changeAllStyleWhenHasSelection(const TText& source, int id);
     void changePartStyleWhenHasSelection(const TText& source, int id, int undoFlag);
     void saveStyleForNextInsert(const TText& style, int undoFlag, int id);
+    // Every character looks as it did before the first preview; does nothing without one.
+    void cancelPreview();
     void setFontFamilyEnsureMode(int mode);
 
     // Tells the panel the style at the cursor or of the selection.
