@@ -346,9 +346,19 @@ private Q_SLOTS:
         QCOMPARE(users()->archive(3)->getOrder(), std::string("4"));
         QCOMPARE(mFixture.userOrder().last(), QString("UserTemplate_004"));
         QCOMPARE(users()->item(3)->getIndex(), 3);
-        tapItem(users(), 3);
+        // The new one is chosen, whichever was before, and remembered.
+        QCOMPARE(users()->selectedItem(), users()->item(3));
+        QVERIFY(users()->item(3)->hasSelectedStyle());
+        QVERIFY(button("selectUserButton")->isEnabled() && button("deleteTemplateButton")->isEnabled());
         QCOMPARE(preview()->textLines().first(), QString("saved"));
         QCOMPARE(fileName()->text(), QString("UserTemplate_004"));
+        tapItem(users(), 1);
+        mFixture.makeUserTemplate("UserTemplate_005");
+        mPicker->slotSaveAsTemplate("UserTemplate_005");
+        QVERIFY(!users()->item(1)->hasSelectedStyle());
+        QCOMPARE(users()->selectedItem(), users()->item(4));
+        mPicker->reloadTemplates2();
+        QCOMPARE(TemplateTab::templateName(*users()->selectedArchive()), QString("UserTemplate_005"));
     }
 
     void imports()
