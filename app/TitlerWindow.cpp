@@ -63,6 +63,7 @@ namespace
 constexpr int UNDO_LIMIT = 25;
 constexpr long SOFT_KEYBOARD_SERVICE_ID = 95;
 constexpr int ARCHIVELISTWIDGET_HEIGHT = 997;
+constexpr int TITLE_ROW_HEIGHT = 38;
 constexpr QPoint WINDOW_PANEL_POS(8, 8);
 constexpr QPoint LEFT_PANEL_POS(12, 61);
 
@@ -205,6 +206,8 @@ void TitlerWindow::createArchiveList()
 {
     mPathLabel = new QLabel;
     mPathLabel->setStyleSheet(QStringLiteral("color:rgb(220,220,220); text-align:left; font:28px;"));
+    // The lines of some families are higher, and the list under the row has a frame at a fixed place.
+    mPathLabel->setFixedHeight(TITLE_ROW_HEIGHT);
 
     mFolderIcon = new QPushButton(this);
     mFolderIcon->setIcon(QIcon(QStringLiteral(":/FolderPicker/Titler_folder_icon")));
@@ -214,7 +217,7 @@ void TitlerWindow::createArchiveList()
     mFolderIcon->setStyleSheet(QStringLiteral("border:0; background:transparent;"));
 
     mMoveButton = new KSPushbutton(QString::fromLatin1(MOVE_BUTTON_IMAGES), this);
-    mMoveButton->setFixedSize(70, 38);
+    mMoveButton->setFixedSize(70, TITLE_ROW_HEIGHT);
     mMoveButton->setText(tr("Move"));
     mMoveButton->setStyleSheet(QStringLiteral("color:rgb(220, 220, 220); font:20px;"));
     mMoveButton->setFocusPolicy(Qt::NoFocus);
@@ -368,6 +371,7 @@ void TitlerWindow::showEvent(QShowEvent* event)
 
 void TitlerWindow::hideEvent(QHideEvent* event)
 {
+    mCanvasScene->endPreview(); // the palette is a window of its own
     WINDOW_IS_SHOWN = false;
     if (!event->spontaneous()) {
         // Whoever asked for a mask may take it away only later, or never.

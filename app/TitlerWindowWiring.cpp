@@ -92,6 +92,7 @@ void TitlerWindow::connectForTextToolsPanel()
             &TextToolsPanel::slotBeginNewTextItem);
     connect(mCanvasScene, &CanvasScene::signalSceneSoftWareClosedWhenEditObject, mTextToolsPanel,
             &TextToolsPanel::slotHideColorPaletteWhenCloseSoftWare);
+    connect(mCanvasScene, &CanvasScene::signalEndPreview, mTextToolsPanel, &TextToolsPanel::slotEndPreview);
     // What is changed goes to the canvas.
     connect(mTextToolsPanel, &TextToolsPanel::signalNotifyEditAreaSizeToolBoxEditDone, mCanvasScene,
             &CanvasScene::slotNotifyEditAreaSizeToolBoxEditDone);

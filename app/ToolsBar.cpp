@@ -6,6 +6,7 @@
 #include "touchui/KSPushbutton.h"
 
 #include <QAction>
+#include <QBitmap>
 #include <QHBoxLayout>
 #include <QLabel>
 #include <QMenu>
@@ -504,6 +505,7 @@ bool ToolsBar::paintCanvasMenu(QEvent* event)
     case QEvent::Resize: {
         DrawBoundingRectangle background;
         m_menuBackground = background.paintBoundingRectangle(MENU_BACKGROUND_KIND);
+        m_menu->setMask(m_menuBackground.mask()); // black corners without a compositor
         return false;
     }
     case QEvent::Paint: {

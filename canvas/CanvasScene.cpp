@@ -25,6 +25,7 @@
 #include <QFileInfo>
 #include <QGraphicsSceneMouseEvent>
 #include <QGraphicsView>
+#include <QInputMethodEvent>
 #include <QMetaMethod>
 #include <QPainter>
 #include <QTextCursor>
@@ -39,8 +40,6 @@ constexpr int SafeAreaAboveTexts = 4;
 constexpr double SamePlace = 1e-12;
 // More steps than objects could need to leave a free place.
 constexpr int MaximumCascade = 1000;
-// Undo flag of a change that is more than a preview or the end of one.
-constexpr int COMMITTED = 1;
 
 } // namespace
 
@@ -126,6 +125,7 @@ void CanvasScene::leaveEditing()
 
 void CanvasScene::clearCanvas()
 {
+    endPreview();
     removeAllItems();
     m_archive.reset();
 }
@@ -144,6 +144,7 @@ bool CanvasScene::archiveIsNull(const Archive* archive)
 
 void CanvasScene::slotUpdateArchive(const Archive* archive)
 {
+    endPreview();
     const auto previous = m_currentPixmapItem ? m_currentPixmapItem->source() : nullptr; // a paste shares it
     savePreviousArchiveInfo();
     // A text that was being typed until now is in no picture yet.
@@ -253,6 +254,7 @@ void CanvasScene::pushCommand(QUndoCommand* command)
 
 void CanvasScene::addCGraphicsTextItem()
 {
+    endPreview();
     if (itemIsEditorInteraction()) {
         saveArchive();
         m_thumbnailNeeded = true;
@@ -405,6 +407,7 @@ void CanvasScene::connectSignalAndSlot(GraphicsText* item)
     connect(item, &Text::signalNotifyTextPropertyAreaObjectSelectionMode, this,
             &CanvasScene::signalSceneNotifyTextPropertyAreaObjectSelectionMode);
     connect(item, &Text::signalSaveArchive, this, &CanvasScene::slotSaveArchive);
+    connect(item, &Text::signalEndPreview, this, &CanvasScene::endPreview);
     connect(item, &Text::signalDeleteItem, this, &CanvasScene::slotDeleteEmptyItems);
     connect(item, &Text::signalShowMessageWhenUsingDefaultFont, this,
             &CanvasScene::slotShowMessageWhenUsingDefaultFont);
@@ -438,10 +441,15 @@ void CanvasScene::slotChangeObjectTextStyle(TText* style, int id, int undoFlag)
 {
     if (!style || style->textItems().empty())
         return;
-    if (undoFlag == COMMITTED)
+    GraphicsText* item = m_texts->findTheActiveItem();
+    takeBackPreviews(undoFlag == GraphicsText::CancelledChange ? nullptr : item);
+    if (undoFlag == GraphicsText::CancelledChange) {
+        m_thumbnailNeeded = true;
+        return;
+    }
+    if (undoFlag == GraphicsText::CommittedChange)
         m_newTextStyle->rememberChange(*style);
     const bool same = isTheSame(style);
-    GraphicsText* item = m_texts->findTheActiveItem();
     if (!item)
         return;
     m_languageChanged = false;
@@ -478,6 +486,21 @@ void CanvasScene::changeItemTextStyleAccordingToItemStatus(GraphicsText* item, T
         break;
     }
     m_thumbnailNeeded = true;
+}
+
+void CanvasScene::takeBackPreviews(const GraphicsText* except)
+{
+    const QList<GraphicsText*> texts = m_texts->listed();
+    for (GraphicsText* item : texts) {
+        if (item != except)
+            item->cancelPreview();
+    }
+}
+
+void CanvasScene::endPreview()
+{
+    Q_EMIT signalEndPreview();
+    takeBackPreviews();
 }
 
 void CanvasScene::slotUpdateCurrentTextProperty(TText& style)
@@ -521,6 +544,7 @@ void CanvasScene::slotDeleteEmptyItems()
 
 void CanvasScene::deleteSelectedItems()
 {
+    endPreview();
     const QList<GraphicsText*> texts = m_texts->enabledTexts();
     for (GraphicsText* item : texts) {
         if (item->getBoundingLineStatus() != GraphicsText::FocusNone && !item->isBlank())
@@ -550,8 +574,15 @@ void CanvasScene::mousePressEvent(QGraphicsSceneMouseEvent* event)
 {
     if (event->button() != Qt::LeftButton)
         return;
+    endPreview();
     m_currentPressedObjectId = -1;
     QGraphicsScene::mousePressEvent(event);
+}
+
+void CanvasScene::mouseDoubleClickEvent(QGraphicsSceneMouseEvent* event)
+{
+    endPreview();
+    QGraphicsScene::mouseDoubleClickEvent(event);
 }
 
 void CanvasScene::mouseReleaseEvent(QGraphicsSceneMouseEvent* event)
@@ -577,11 +608,13 @@ void CanvasScene::mouseReleaseEvent(QGraphicsSceneMouseEvent* event)
 
 void CanvasScene::clearItemsSelectionMode()
 {
+    endPreview();
     m_texts->clearSelectionMode();
 }
 
 void CanvasScene::clearItemsSelectionAndFocus()
 {
+    endPreview();
     m_texts->releaseAllBut(-1);
 }
 
@@ -597,12 +630,21 @@ bool CanvasScene::itemIsEditorInteraction() const
 
 void CanvasScene::keyPressEvent(QKeyEvent* event)
 {
+    endPreview();
     const QList<GraphicsText*> texts = m_texts->enabledTexts();
     for (GraphicsText* item : texts) {
         if (item->textInteractionFlags() == Qt::TextEditorInteraction)
             setFocusItem(item, Qt::OtherFocusReason);
     }
     QGraphicsScene::keyPressEvent(event);
+}
+
+void CanvasScene::inputMethodEvent(QInputMethodEvent* event)
+{
+    if (!event->commitString().isEmpty() || !event->preeditString().isEmpty() ||
+        event->replacementLength() > 0)
+        endPreview();
+    QGraphicsScene::inputMethodEvent(event);
 }
 
 void CanvasScene::focusOutEvent(QFocusEvent* event)

@@ -133,6 +133,9 @@ public Q_SLOTS:
     void slotSaveArchive(GraphicsText* item);
     void slotSetItemInputlanguage(GraphicsText* item);
     void slotNotifyEditAreaSizeToolBoxEditDone() {}
+    // Call before the selection, its text or the title changes. Whoever previews a style ends that now, and
+    // what is still previewed after that is taken back.
+    void endPreview();
 
 Q_SIGNALS:
     void signalTextInserted();
@@ -153,8 +156,12 @@ Q_SIGNALS:
     void signalDisableNewTextButton(bool disable);
     void signalCanvasSceneMousePressed();
     void signalSceneSoftWareClosedWhenEditObject();
+    // The selection, its text or the title is about to change; what was selected still is.
+    void signalEndPreview();
 
 protected:
+    void mouseDoubleClickEvent(QGraphicsSceneMouseEvent* event) override;
+    void inputMethodEvent(QInputMethodEvent* event) override;
     void mousePressEvent(QGraphicsSceneMouseEvent* event) override;
     void mouseReleaseEvent(QGraphicsSceneMouseEvent* event) override;
     void keyPressEvent(QKeyEvent* event) override;
@@ -175,6 +182,7 @@ private:
     QPointF getInitItemScenePosition();
     void changeItemTextStyleAccordingToItemStatus(GraphicsText* item, TText* style, int id, int mode,
                                                   bool overall, int undoFlag);
+    void takeBackPreviews(const GraphicsText* except = nullptr);
     void pushDeleteCommand(GraphicsText* item);
     bool saveArchiveXML(const QString& path);
     bool lacksPictures() const;

@@ -166,6 +166,7 @@ TText* GraphicsText::getItemTText() const
 TText* GraphicsText::getTextList() const
 {
     auto copy = std::make_unique<TText>(m_styles->current());
+    m_styles->removePreviewFrom(*copy);
     copy->setText(toPlainText().toStdString());
     return copy.release();
 }
@@ -256,6 +257,11 @@ void GraphicsText::saveStyleForNextInsert(TText* style, int undoFlag, int id)
 {
     if (style)
         m_styleEditor->saveStyleForNextInsert(*style, undoFlag, id);
+}
+
+void GraphicsText::cancelPreview()
+{
+    m_styleEditor->cancelPreview();
 }
 
 void GraphicsText::setInputLanguage(int row)
@@ -475,8 +481,10 @@ void GraphicsText::customEvent(QEvent* event)
     if (m_parentObject)
         return;
     if (event->type() == QEvent::Type(KSInputContext::SoftKeyBoardCloseType)) {
+        Q_EMIT signalEndPreview();
         m_touchEditor->keyboardClosed();
     } else if (event->type() == KSSoftKeyboardCursorSettingEvent::myType) {
+        Q_EMIT signalEndPreview();
         const auto& setting = static_cast<KSSoftKeyboardCursorSettingEvent&>(*event);
         getSelectionInfo(setting.getCursorBeginPos(), setting.getCursorEndPos(),
                          setting.getCursorCurrentPos(), setting.getCursorSelectionMode());

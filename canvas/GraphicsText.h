@@ -53,7 +53,8 @@ public:
 
     // The live record, owned by the item.
     TText* getItemTText() const;
-    // A new copy of the record with the plain text set as its text; the caller owns it.
+    // A new copy of the record with the plain text set as its text and without what is only previewed; the
+    // caller owns it.
     TText* getTextList() const;
     // The style that the next character of an emptied object takes; owned by the item.
     TText* getLastAlpaTextStyleValue() const;
@@ -72,13 +73,15 @@ public:
     bool isHandleCaret() const;
     bool isDoubleClickedSelection() const;
 
-    // Style changes; source holds one style per changed character, property ids are those of StyleProperty.
-    // undoFlag 0 is a preview, 1 a committed change, 2 a cancelled palette.
+    // Style changes; source holds one style per changed character, property ids are those of StyleProperty
+    // and flags those of UndoFlag. Only a committed change is a step of undo.
     void changeAllStyleWhenSelectionMode(TText* source, int id, bool overall, int undoFlag);
     void changeAllStyleWhenEditMode(TText* source, int id, bool overall, int undoFlag);
     void changeAllStyleWhenHasSelection(TText* source, int id);
     void changePartStyleWhenHasSelection(TText* source, int id, int undoFlag);
     void saveStyleForNextInsert(TText* style, int undoFlag, int id);
+    // Gives back every character's own style after previews; does nothing without one.
+    void cancelPreview();
 
     // Row of the font tables, shared by all objects.
     void setInputLanguage(int row);
@@ -151,6 +154,8 @@ Q_SIGNALS:
     void signalObjectSelectedHasChanged(QGraphicsItem* item);
     void signalObjectHasLostFocus(GraphicsText* item);
     void signalGetSceneInputLanguage(GraphicsText* item);
+    // What is selected or written is about to change from outside: a preview has to end first.
+    void signalEndPreview();
 
 protected:
     void mousePressEvent(QGraphicsSceneMouseEvent* event) override;

@@ -4,6 +4,7 @@
 
 #include <algorithm>
 #include <cmath>
+#include <utility>
 
 namespace
 {
@@ -134,6 +135,7 @@ void StyleDocument::setCurrent(const TText& record)
 {
     m_current = record;
     normalise(m_current);
+    m_previewing = false;
 }
 
 void StyleDocument::insert(int position, std::vector<std::unique_ptr<TextStyle>> styles)
@@ -303,6 +305,29 @@ void StyleDocument::markEditStart()
 {
     synchronise(m_editStart, m_current);
     synchronise(m_editStartLastAlpha, m_lastAlpha);
+}
+
+void StyleDocument::markPreviewStart()
+{
+    if (!m_previewing)
+        synchronise(m_beforePreview, m_current);
+    m_previewing = true;
+}
+
+bool StyleDocument::takeBackPreview()
+{
+    removePreviewFrom(m_current);
+    return std::exchange(m_previewing, false);
+}
+
+void StyleDocument::removePreviewFrom(TText& copy) const
+{
+    const auto& before = m_beforePreview.textItems();
+    const auto& items = copy.textItems();
+    if (!m_previewing || before.size() != items.size())
+        return;
+    for (size_t i = 0; i < items.size(); ++i)
+        *items[i] = *before[i];
 }
 
 void StyleDocument::saveForNextInsert(const TText& style, int property, int cursorPosition)

@@ -61,6 +61,15 @@ public:
     // Copies of the current state into a snapshot; only what differs is written.
     void refreshUndoBaseline() { synchronise(m_undoBaseline, m_current); }
     void markEditStart();
+
+    // From the first preview on until it is taken back or another record is set, the state of before is kept.
+    void markPreviewStart();
+    bool isPreviewing() const { return m_previewing; }
+    // Gives every style the value that it had before the preview; returns whether there was one.
+    bool takeBackPreview();
+    // Does the same to a copy of the current record.
+    void removePreviewFrom(TText& copy) const;
+
     static void synchronise(TText& target, const TText& source);
 
     void saveForNextInsert(const TText& style, int property, int cursorPosition);
@@ -90,6 +99,8 @@ private:
     TText m_undoBaseline;
     TText m_editStart;
     TText m_editStartLastAlpha;
+    TText m_beforePreview;
+    bool m_previewing = false;
     bool m_styleSaved = false;
     int m_savedProperty = -1;
     // -2: none; -1: cleared by a move of the cursor.

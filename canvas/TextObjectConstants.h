@@ -76,6 +76,9 @@ struct TextObjectConstants {
         PropertyPosition = 11
     };
 
+    // Undo flag of a style change: a preview leaves no step of undo and is taken back by Cancel.
+    enum UndoFlag { PreviewedChange = 0, CommittedChange = 1, CancelledChange = 2 };
+
     // Focus flag and bounding line status.
     enum FocusState { FocusNone = -1, FocusEdit = 0, FocusObject = 1 };
 };

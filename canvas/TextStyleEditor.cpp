@@ -129,11 +129,13 @@ void TextStyleEditor::documentChanged(int position, int removed, int added)
     removed = std::clamp(removed, 0, std::max(m_styles.count() - position, 0));
     added = std::max(documentLength(*m_item.document()) - (m_styles.count() - removed), 0);
     added = cutOffCharsBeyondMaxNum(position, added);
+    trimUnchanged(position, removed, added);
     if (removed == 0 && added == 0)
         return;
 
     m_item.touchEditor().clearHandleCaret();
     m_undoFlag = 1;
+    const bool previewTakenBack = m_styles.takeBackPreview(); // new characters do not take it over
     if (removed > 0 && added > 0) {
         replaceCharacters(position, removed, added);
     } else {
@@ -144,6 +146,10 @@ void TextStyleEditor::documentChanged(int position, int removed, int added)
             charsAddedChange(position, added);
     }
     reconcile();
+    if (previewTakenBack) {
+        const Guard guard(*this);
+        applyFormats(0, m_styles.count());
+    }
     showCurrentTextStyle();
     m_item.touchEditor().clearHandleCaret();
 }
@@ -181,6 +187,28 @@ int TextStyleEditor::cutOffCharsBeyondMaxNum(int position, int added)
     finishLayout();
     updateWidthAndAlign(m_lastWidth);
     return std::max(added - (end - begin), 0);
+}
+
+// With every event of an input method the document reports the whole paragraph, whose characters are the same
+// but for what was committed. They would lose their styles.
+void TextStyleEditor::trimUnchanged(int& position, int& removed, int& added) const
+{
+    const QTextBlock block = m_item.document()->findBlock(position);
+    if (removed == 0 || added == 0 || position != block.position() || added < block.length() - 1)
+        return;
+    const QString text = m_item.toPlainText();
+    const auto isSame = [&](int style, int character) {
+        return m_styles.at(style)->getText() == StyleDocument::storedText(text, character).toStdString();
+    };
+    while (removed > 0 && added > 0 && isSame(position, position)) {
+        ++position;
+        --removed;
+        --added;
+    }
+    while (removed > 0 && added > 0 && isSame(position + removed - 1, position + added - 1)) {
+        --removed;
+        --added;
+    }
 }
 
 void TextStyleEditor::replaceCharacters(int position, int removed, int added)
@@ -360,6 +388,7 @@ void TextStyleEditor::changeAllStyleWhenSelectionMode(const TText& source, int i
 void TextStyleEditor::changeAllStyleWhenHasSelection(const TText& source, int id)
 {
     pushLastEditTextIntoStack();
+    cancelPreview();
     const Guard guard(*this);
     TText before = m_styles.current();
     TText beforeLast = m_styles.lastAlpha();
@@ -386,6 +415,10 @@ void TextStyleEditor::changeAllStyleWhenHasSelection(const TText& source, int id
 void TextStyleEditor::changePartStyleWhenHasSelection(const TText& source, int id, int undoFlag)
 {
     pushLastEditTextIntoStack();
+    if (undoFlag == PreviewedChange)
+        m_styles.markPreviewStart();
+    else
+        cancelPreview(); // the step of undo leads from before the preview to this change
     m_undoFlag = undoFlag;
     const QTextCursor cursor = m_item.textCursor();
     const Guard guard(*this);
@@ -393,12 +426,24 @@ void TextStyleEditor::changePartStyleWhenHasSelection(const TText& source, int i
     TText beforeLast = m_styles.lastAlpha();
     changeSelectionProperty(id, source, cursor.anchor(), cursor.position());
     applyShadow();
-    if (undoFlag == 1) {
+    if (undoFlag == CommittedChange) {
         emitEdited(before, beforeLast);
         m_styles.refreshUndoBaseline();
     }
     m_styles.forgetNextInsert();
     m_item.update();
+}
+
+void TextStyleEditor::cancelPreview()
+{
+    if (!m_styles.takeBackPreview())
+        return;
+    const Guard guard(*this);
+    applyFormats(0, m_styles.count());
+    updateWidthAndAlign(m_lastWidth);
+    applyShadow();
+    m_undoFlag = CommittedChange;
+    m_styles.refreshUndoBaseline();
 }
 
 void TextStyleEditor::changeSelectionProperty(int id, const TText& source, int from, int to)

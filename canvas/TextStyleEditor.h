@@ -27,6 +27,8 @@ public:
     void changeAllStyleWhenHasSelection(const TText& source, int id);
     void changePartStyleWhenHasSelection(const TText& source, int id, int undoFlag);
     void saveStyleForNextInsert(const TText& style, int undoFlag, int id);
+    // Every character looks as it did before the first preview; does nothing without one.
+    void cancelPreview();
     void setFontFamilyEnsureMode(int mode);
 
     // Tells the panel the style at the cursor or of the selection.
@@ -56,6 +58,8 @@ private:
     void insertRecord();
     void applyFormats(int begin, int end);
     int cutOffCharsBeyondMaxNum(int position, int added);
+    // Leaves out of a reported change what is as it was.
+    void trimUnchanged(int& position, int& removed, int& added) const;
     void replaceCharacters(int position, int removed, int added);
     void charsAddedChange(int position, int added);
     void charsRemovedChange(int position, int count);

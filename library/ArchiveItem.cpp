@@ -14,6 +14,7 @@
 #include <QPixmap>
 #include <QPixmapCache>
 #include <QTextLayout>
+#include <QTextOption>
 #include <QtMath>
 #include <algorithm>
 
@@ -38,7 +39,10 @@ namespace
 
 const int NARROW_LABEL_WIDTH = 250;
 const int NARROW_LABEL_HEIGHT = 24;
-const int CHECKER_SQUARE = 8; // pixels
+const int NARROW_PADDING_X = 12;
+const int NARROW_PADDING_TOP = 8;
+const int HANDLE_GAP = 6;      // between the text and the handle of move mode
+const int CHECKER_SQUARE = 15; // pixels
 
 QPixmap checkerPicture()
 {
@@ -111,6 +115,27 @@ void ArchiveItem::initArchiveItemChildWidget(const QImage& picture)
         setDragFlag(true); // over the new children
 }
 
+void ArchiveItem::setDragFlag(bool dragFlag)
+{
+    KSBaseItemWidget::setDragFlag(dragFlag);
+    fitLinesToHandle();
+}
+
+// The text ends before the handle.
+void ArchiveItem::fitLinesToHandle()
+{
+    if (mType != LIST_ITEM || !hasChildWidgets())
+        return;
+    const bool hasHandle = hasDragFlag() && getDragFlagAlignment() == DRAGFLAG_RIGHT;
+    const int width =
+        hasHandle ? getHandlePos().x() - HANDLE_GAP - RIGHT_CHILD_POS.x() : DISPLY_TEXT_SIZE_LENTH;
+    if (mLabels.first()->width() == width)
+        return;
+    for (QLabel* label : mLabels)
+        label->setFixedWidth(width);
+    updateRightChild();
+}
+
 void ArchiveItem::createLeftChild()
 {
     mScene = new QGraphicsScene(0, 0, LEFT_CHILD_WIDTH, CHILD_HEIGHT, this);
@@ -148,7 +173,9 @@ void ArchiveItem::createRightChild()
         label->setStyleSheet(narrow ? QStringLiteral(" background: transparent; color:rgb(178, 178, 178);")
                                     : QStringLiteral(" background: transparent; color:rgb(220, 220, 220);"));
         label->setFixedSize(line);
-        label->move(0, i * line.height());
+        if (narrow)
+            label->setContentsMargins(NARROW_PADDING_X, 0, NARROW_PADDING_X, 0);
+        label->move(0, (narrow ? NARROW_PADDING_TOP : 0) + i * line.height());
         mLabels.append(label);
     }
     mTextWidget->show();
@@ -211,20 +238,24 @@ void ArchiveItem::setTextArea()
         setManyTextArea();
 }
 
+// Runs over the lines word by word; what is left for the last line and does not fit is elided there.
 void ArchiveItem::setOneTextArea(const QString& text)
 {
-    QString rest = text.simplified();
+    const QString words = text.simplified();
+    QTextLayout layout(words, mLabels.first()->font());
+    QTextOption wrapping;
+    wrapping.setWrapMode(QTextOption::WrapAtWordBoundaryOrAnywhere);
+    layout.setTextOption(wrapping);
+    layout.beginLayout();
     for (QLabel* label : mLabels) {
-        if (rest.isEmpty())
-            return;
-        setLabelText(rest, label);
-        const QString shown = label->text();
-        if (shown == rest)
-            return;
-        // The last character shown is the ellipsis. A line always takes something, or a character wider than
-        // the line would fill all lines with ellipses.
-        rest = rest.mid(std::max<qsizetype>(shown.size() - 1, 1)).trimmed();
+        QTextLine line = layout.createLine();
+        if (!line.isValid())
+            break;
+        line.setLineWidth(label->contentsRect().width());
+        const bool isLast = label == mLabels.last();
+        setLabelText(words.mid(line.textStart(), isLast ? -1 : line.textLength()).trimmed(), label);
     }
+    layout.endLayout();
 }
 
 void ArchiveItem::setManyTextArea()
@@ -241,7 +272,8 @@ void ArchiveItem::setManyTextArea()
 
 void ArchiveItem::setLabelText(const QString& text, QLabel* label)
 {
-    label->setText(QFontMetrics(label->font()).elidedText(text, Qt::ElideRight, label->width()));
+    const int room = label->contentsRect().width();
+    label->setText(QFontMetrics(label->font()).elidedText(text, Qt::ElideRight, room));
     placeLine(label);
 }
 

@@ -72,6 +72,9 @@ public:
     // The lines that are shown, for those who cannot see them.
     QStringList textLines() const;
 
+    // The text lines make room for the handle.
+    void setDragFlag(bool dragFlag) override;
+
     // An item of a copied record, which the clone owns. The caller owns the clone.
     ArchiveItem* clone() override;
 
@@ -82,6 +85,7 @@ public:
 private:
     void createLeftChild();
     void createRightChild();
+    void fitLinesToHandle();
     void placeLine(QLabel* label) const;
     void setTextArea();
     void setOneTextArea(const QString& text);

@@ -43,6 +43,7 @@ const int FRAME_MARGIN = 9;
 const int SEPARATOR_HEIGHT = 4;
 const int DATE_WIDTH = 250;
 const int BUTTON_SPACE = 8;
+const int SIDE_MARGIN = FRAME_MARGIN + BUTTON_SPACE; // beside what lies in the frame
 constexpr QSize BUTTON_SIZE(160, 48);
 // Inside the frame, which is dark by itself.
 constexpr QRect MASK_AREA(7, 9, 1088 - 14, 742 - 18);
@@ -97,7 +98,7 @@ void FolderPicker::createTree()
 {
     const int between =
         STARTPOINT_OF_BOTTOM_HSEPARATOR.y() - STARTPOINT_OF_TOP_HSEPARATOR.y() - SEPARATOR_HEIGHT;
-    const QPoint place(FOLDER_PICKER_SIZE.width() - FRAME_MARGIN - FOLDER_TREEVIEW_SIZE.width(),
+    const QPoint place(FOLDER_PICKER_SIZE.width() - SIDE_MARGIN - FOLDER_TREEVIEW_SIZE.width(),
                        STARTPOINT_OF_TOP_HSEPARATOR.y() + SEPARATOR_HEIGHT +
                            (between - FOLDER_TREEVIEW_SIZE.height()) / 2);
     mTree = new KSTreeView(this);
@@ -127,7 +128,7 @@ void FolderPicker::createDetails()
     mTitle = label(QRect(2 * FRAME_MARGIN, FRAME_MARGIN, HSEPARATOR_LENGTH - 2 * FRAME_MARGIN,
                          STARTPOINT_OF_TOP_HSEPARATOR.y() - FRAME_MARGIN),
                    "folderPickerTitle");
-    const int left = (mTree->x() - LEFT_WIDTH) / 2;
+    const int left = FRAME_MARGIN + (mTree->x() - FRAME_MARGIN - LEFT_WIDTH) / 2;
     mThumbnail = label(QRect(left, mTree->y(), LEFT_WIDTH, WIDGET_HEIGHT), "folderThumbnail");
     mSizeLabel =
         label(QRect(left, mTree->y() + WIDGET_HEIGHT + FRAME_MARGIN, LEFT_WIDTH, 34), "folderFileSize");
@@ -140,7 +141,7 @@ void FolderPicker::createButtons()
     const char* names[] = {"duplicateFolderButton", "newFolderButton", "openFolderButton",
                            "cancelFolderButton"};
     const int right = mTree->geometry().right() + 1;
-    const int left = FRAME_MARGIN + BUTTON_SPACE;
+    const int left = SIDE_MARGIN;
     const int step = BUTTON_SIZE.width() + BUTTON_SPACE;
     const int places[] = {left, left + step, right - step - BUTTON_SIZE.width(), right - BUTTON_SIZE.width()};
     const int top = STARTPOINT_OF_BOTTOM_HSEPARATOR.y() + SEPARATOR_HEIGHT;

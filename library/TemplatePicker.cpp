@@ -9,6 +9,7 @@
 #include "touchui/KSPushbutton.h"
 #include "touchui/WindowPlaceKeeper.h"
 
+#include <QBitmap>
 #include <QFontMetrics>
 #include <QLabel>
 #include <QPainter>
@@ -119,6 +120,7 @@ void TemplatePicker::createPropertyArea()
     mTextCaption = createLabel(mUserTab, none, "textCaption");
     mPreview = new ArchiveItem(&mPreviewArchive, ArchiveItem::NARROW_ITEM, mUserTab);
     mPreview->initArchiveItemChildWidget();
+    mPreview->setFixedWidth(PROPERTY_AREA_PARTS_WIDTH); // as the box of the name
     mDeleteButton2 = createButton(mUserTab, QPoint(), "deleteTemplateButton");
     connect(mDeleteButton2, &QPushButton::clicked, this, &TemplatePicker::deleteClicked2);
 }
@@ -186,6 +188,10 @@ void TemplatePicker::translateText()
 void TemplatePicker::showEvent(QShowEvent* event)
 {
     QDialog::showEvent(event);
+    if (mFrame.isNull()) {
+        mFrame = DrawBoundingRectangle().paintBoundingRectangle(DIALOG_FRAME);
+        setMask(mFrame.mask()); // black corners without a compositor
+    }
     if (const QWidget* window = parentWidget())
         move(window->mapToGlobal(window->rect().center()) - rect().center());
     for (TemplateTab* tab : {mPresetTab, mUserTab})
@@ -217,8 +223,6 @@ void TemplatePicker::paintEvent(QPaintEvent* event)
 {
     QDialog::paintEvent(event);
     QPainter painter(this);
-    if (mFrame.isNull())
-        mFrame = DrawBoundingRectangle().paintBoundingRectangle(DIALOG_FRAME);
     painter.drawPixmap(OUTSIDE_BORDER_STARTPOINT, mFrame);
     drawHorizontalLine(painter);
 }

@@ -196,9 +196,11 @@ int TemplatePicker::findTemplateIdFromName(const QString& name) const
 void TemplatePicker::slotSaveAsTemplate(QString name)
 {
     auto archive = std::make_unique<Archive>();
-    mUserController.loadTemplate(name.toStdString(), archive.get());
+    const bool isRead = mUserController.loadTemplate(name.toStdString(), archive.get()) != 0;
     mUserController.addNewTemplateToLastInOrderXml(name.toStdString());
-    addNewTemplateToLast(archive.release());
+    TemplateItem* item = addNewTemplateToLast(archive.release());
+    if (isRead)
+        mUserTab->select(item); // what the picker scrolls to
 }
 
 void TemplatePicker::slotImportNewUserTemplate(QString name)

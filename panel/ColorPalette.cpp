@@ -197,8 +197,6 @@ void ColorPalette::reject()
 
 void ColorPalette::closePalette()
 {
-    if (isHidden())
-        return;
     hide();
     if (KSInputContext* input = KSInputContext::instance())
         input->hideMaskOnSoftKeyboard();

@@ -47,9 +47,6 @@ public:
     int currentIndex() const { return m_currentIndex; }
     const QList<QString>& colors() const { return m_colors; }
 
-    // Hides the palette and takes the mask off the soft keyboard, without an answer.
-    void closePalette();
-
     // While a mask shows, the palette takes no touches.
     void showDialogMask(bool show);
     void showMessageMask(bool show);
@@ -59,7 +56,7 @@ public:
 public Q_SLOTS:
     // Global coordinates.
     void setTitlerWindowRect(QRect rect) { m_titlerWindowRect = rect; }
-    // Escape is Cancel.
+    // Cancel, also by Escape; does nothing while the palette is hidden.
     void reject() override;
 
 Q_SIGNALS:
@@ -84,6 +81,8 @@ private:
     void setColorValue(int index);
     void okClicked();
     void cancelClicked();
+    // Hides the palette and takes the mask off the soft keyboard.
+    void closePalette();
     void drawFocusBoundingRect(QPainter& painter) const;
     void drawHorizontalLine(QPainter& painter, const QRect& line) const;
     bool onTouchEvent(const QTouchEvent* event);

@@ -118,6 +118,12 @@ void EdgeSizeSlider::showEvent(QShowEvent* event)
     m_outsidePress->start();
 }
 
+void EdgeSizeSlider::resizeEvent(QResizeEvent* event)
+{
+    QMenu::resizeEvent(event);
+    setMask(m_frame.mask(size()));
+}
+
 void EdgeSizeSlider::hideEvent(QHideEvent* event)
 {
     m_outsidePress->stop();

@@ -4,6 +4,8 @@
 #include "touchui/KSPushbutton.h"
 #include "touchui/KSRadiobutton.h"
 
+#include <QEvent>
+#include <QFontMetrics>
 #include <QGridLayout>
 #include <QHBoxLayout>
 #include <QLabel>
@@ -32,6 +34,7 @@ constexpr int ROW_SPACING = 24;
 constexpr int LABEL_SPACING = 8;
 constexpr int RANGE_WIDTH = 110;
 constexpr int RANGE_LABEL_WIDTH = 62;
+constexpr int SLACK = 2; // widths are rounded
 
 template <typename Layout>
 Layout* newLayout()
@@ -56,6 +59,7 @@ RangeOfMoveText::RangeOfMoveText(QWidget* parent) : ToolBox(parent)
     m_description =
         addLabel(QSize(DESCRIPTIONLABEL_WIDTH, WIDGET_HEIGHT), MOVELABEL_STYLE, MOVELABEL_DISABLED_STYLE);
     m_description->setWordWrap(true);
+    m_description->installEventFilter(this);
     m_twoPixels = addRangeChoice(TWO_PIXELS_ID);
     m_tenPixels = addRangeChoice(TEN_PIXELS_ID);
     m_twoPixels.button->setChecked(true);
@@ -152,9 +156,33 @@ void RangeOfMoveText::resetInitializeStyle()
     ToolBox::resetInitializeStyle();
 }
 
+bool RangeOfMoveText::eventFilter(QObject* watched, QEvent* event)
+{
+    if (watched == m_description && event->type() == QEvent::FontChange)
+        balanceDescription();
+    return ToolBox::eventFilter(watched, event);
+}
+
+// Leaves the text as little room as it needs for its lines, so that no word stands on the last one alone.
+void RangeOfMoveText::balanceDescription()
+{
+    m_description->setContentsMargins(0, 0, 0, 0);
+    const QFontMetrics metrics(m_description->font());
+    const auto area = [&](int width) {
+        return metrics.boundingRect(QRect(0, 0, width, WIDGET_HEIGHT), Qt::TextWordWrap,
+                                    m_description->text());
+    };
+    const int height = area(DESCRIPTIONLABEL_WIDTH).height();
+    int width = DESCRIPTIONLABEL_WIDTH;
+    while (area(width - 1).height() == height && area(width - 1).width() < width)
+        --width;
+    m_description->setContentsMargins(0, 0, qMax(0, DESCRIPTIONLABEL_WIDTH - width - SLACK), 0);
+}
+
 void RangeOfMoveText::translateText()
 {
     m_description->setText(tr("Range of move per 1 tap"));
+    balanceDescription();
     m_twoPixels.label->setText(tr("2px"));
     m_tenPixels.label->setText(tr("10px"));
 }

@@ -44,6 +44,8 @@ public:
     void resetInitializeStyle() override;
     void translateText() override;
 
+    bool eventFilter(QObject* watched, QEvent* event) override;
+
 Q_SIGNALS:
     // direction is one of the button indices.
     void moveRangeChanged(int range, int direction, int id);
@@ -59,6 +61,7 @@ private:
     QLayout* createCross();
     void moveChanged(int buttonId);
     void rangeReleased(int buttonId);
+    void balanceDescription();
 
     QLabel* m_description = nullptr;
     RangeChoice m_twoPixels;

@@ -279,7 +279,13 @@ void TextToolsPanel::slotCanvasSceneMouseTouched()
 
 void TextToolsPanel::slotHideColorPaletteWhenCloseSoftWare()
 {
-    m_palette->closePalette();
+    m_palette->reject();
+}
+
+void TextToolsPanel::slotEndPreview()
+{
+    m_palette->reject();
+    hideEdgeSlider();
 }
 
 void TextToolsPanel::slotClearSizeBoxLineEditFocus(bool clear)

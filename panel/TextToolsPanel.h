@@ -120,6 +120,9 @@ public Q_SLOTS:
     void modifyFontFamilyComboxItem(bool isAllItems);
     void slotCanvasSceneMouseTouched();
     void slotHideColorPaletteWhenCloseSoftWare();
+    // The selection, its text or the title is about to change: an open palette is cancelled, and the width
+    // that an open slider shows is committed.
+    void slotEndPreview();
     void slotClearSizeBoxLineEditFocus(bool clear);
     void slotShowFontFamilyComboxList(bool shown);
     void slotAbsoluteShowCanvasMenu(bool shown);
@@ -145,6 +148,7 @@ private:
     static QString changeintValueToString(int value);
     void rememberStyle() const;
     void showPalette(PaletteOwner owner, const QString& color);
+    void cancelPaletteOfOthers();
     void saveColorList();
 
     // The reverse path.
@@ -155,7 +159,6 @@ private:
     void setChildWidgetDisabled();
     void showSelectionMode();
     void showFontStyle(const FontStyle& style);
-    void followPalette();
     TText getTTextStyleForNew() const;
 
     FamilyToolBox* m_family = nullptr;
@@ -181,7 +184,8 @@ private:
     bool m_moveEnabled = false;
     bool m_edgePreview = false;
     int m_paletteOwner = NO_OWNER;
-    QList<QString> m_savedColors; // one a character, for Cancel
+    bool m_paletteAnswers = false; // the change that goes on is the palette's own
+    QList<QString> m_savedColors;  // one a character, for Cancel
     QString m_defaultFamily;
     QRect m_titlerWindowRect;
     SystemSetupDef::emInformationModel m_model = SystemSetupDef::emInformationModelDefault;

@@ -11,6 +11,8 @@
 #include "support/LogManager.h"
 #include "touchui/KSInputContext.h"
 
+#include <QScopedValueRollback>
+
 namespace
 {
 
@@ -42,6 +44,7 @@ void TextToolsPanel::change(const std::wstring& log, int id, int undoFlag, Edit 
 {
     if (!m_style)
         return;
+    cancelPaletteOfOthers();
     if (!log.empty())
         LOG_USER_OPERATE(LOG_AREA, OPERATION, log);
     if (m_enabledForChange != 1)
@@ -113,6 +116,7 @@ void TextToolsPanel::changeEdge(int on, TEdge edge, int id, int undoFlag, int ki
 {
     if (!m_style)
         return;
+    cancelPaletteOfOthers();
     outPutUserLog(on, edge, undoFlag, kind);
     m_edgePreview = id == TextObjectConstants::PropertyEdgeWidthPreview;
     change(std::wstring(), id, undoFlag, [&](TText& style) {
@@ -258,12 +262,14 @@ void TextToolsPanel::showEdgeColorPalette()
     showPalette(EDGE_COLOR_OWNER, m_edge->getColor());
 }
 
-// A palette that is open for the other colour is cancelled by it first.
+// A palette that is open for the other colour is cancelled by it first; one that is open for this colour
+// keeps what it gives back.
 void TextToolsPanel::showPalette(PaletteOwner owner, const QString& color)
 {
     m_size->clearFocusOfSizeBoxLineEdit(true);
-    if (m_palette->isVisible() && m_paletteOwner != owner)
-        m_palette->reject();
+    if (m_palette->isVisible() && m_paletteOwner == owner)
+        return;
+    m_palette->reject();
     m_paletteOwner = owner;
     m_palette->setCurrentColor(color);
     m_palette->move(m_titlerWindowRect.topLeft() + PALETTE_PLACE);
@@ -284,8 +290,16 @@ void TextToolsPanel::saveColorList()
     }
 }
 
+// A change by anything but the palette would take the previewed colour over.
+void TextToolsPanel::cancelPaletteOfOthers()
+{
+    if (!m_paletteAnswers)
+        m_palette->reject();
+}
+
 void TextToolsPanel::getColorValue(QString color, int state)
 {
+    const QScopedValueRollback answers(m_paletteAnswers, true);
     if (m_paletteOwner == TEXT_COLOR_OWNER) {
         m_textColor->getColorValue(color, state);
     } else if (m_paletteOwner == EDGE_COLOR_OWNER) {

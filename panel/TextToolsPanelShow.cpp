@@ -24,11 +24,11 @@ void TextToolsPanel::updateTextStyle(TText* style)
 {
     if (!style || style->textItems().empty())
         return;
+    cancelPaletteOfOthers();
     m_enabledForChange = 0;
     m_style = std::make_unique<TText>(*style);
     setChildWidget();
     setChildWidgetEnabled();
-    followPalette();
     m_enabledForChange = 1;
 }
 
@@ -84,19 +84,6 @@ void TextToolsPanel::setChildWidgetValue(const QString& family, int bold, int it
     m_workingShadow = *m_style->getTextShadow();
 }
 
-// The selection can change under an open palette.
-void TextToolsPanel::followPalette()
-{
-    if (!m_palette->isVisible() || m_savedColors.size() == qsizetype(m_style->textItems().size()))
-        return;
-    if (m_paletteOwner == TEXT_COLOR_OWNER) {
-        m_palette->setCurrentColor(m_textColor->getColor());
-    } else if (m_paletteOwner == EDGE_COLOR_OWNER) {
-        m_palette->setCurrentColor(m_edge->getColor());
-    }
-    saveColorList();
-}
-
 // Enabling
 
 void TextToolsPanel::changeFontPropertyBtnStatus(bool enabled)
@@ -104,6 +91,7 @@ void TextToolsPanel::changeFontPropertyBtnStatus(bool enabled)
     if (enabled) {
         setChildWidgetEnabled();
     } else {
+        m_palette->reject();
         setChildWidgetDisabled();
     }
 }
@@ -149,8 +137,7 @@ void TextToolsPanel::setChildWidgetDisabled()
 
 void TextToolsPanel::initTextToolsPanel()
 {
-    m_palette->closePalette();
-    hideEdgeSlider();
+    slotEndPreview();
     hideFontFamilyComboxList();
     hideFontSizeComboxList();
     m_size->clearFocusOfSizeBoxLineEdit(true);
@@ -182,7 +169,7 @@ void TextToolsPanel::showFontStyle(const FontStyle& style)
 
 void TextToolsPanel::slotBeginNewTextItem()
 {
-    m_palette->reject(); // a colour that is only tried out is none of a new text
+    slotEndPreview();
     TText style = getTTextStyleForNew();
     Q_EMIT signalUpdateCurrentTextProperty(style);
 }

@@ -1,5 +1,6 @@
 #include "touchui/SliceFrame.h"
 
+#include <QBitmap>
 #include <QPainter>
 
 #include <algorithm>
@@ -31,6 +32,19 @@ void SliceFrame::paint(QPainter& painter, const QRect& target) const
     for (int i = 0; i < NineSlice::PieceCount; ++i) {
         paintPiece(painter, static_cast<NineSlice::Piece>(i), cells[i]);
     }
+}
+
+QRegion SliceFrame::mask(const QSize& size) const
+{
+    QPixmap shape(size);
+    if (shape.isNull()) {
+        return QRegion();
+    }
+    shape.fill(Qt::transparent);
+    QPainter painter(&shape);
+    paint(painter, shape.rect());
+    painter.end();
+    return QRegion(shape.mask());
 }
 
 void SliceFrame::paintPiece(QPainter& painter, NineSlice::Piece piece, const QRect& target) const

@@ -3,6 +3,8 @@
 #include "touchui/NineSlice.h"
 
 #include <QPixmap>
+#include <QRegion>
+#include <QSize>
 #include <QStringList>
 
 #include <array>
@@ -23,6 +25,9 @@ public:
 
     // In the painter's coordinates.
     void paint(QPainter& painter, const QRect& target) const;
+    // What a frame of this size covers; empty for an empty frame. A window that has it for its mask is round
+    // without a compositor, too, where what is transparent would be black.
+    QRegion mask(const QSize& size) const;
     void paintPiece(QPainter& painter, NineSlice::Piece piece, const QRect& target) const;
 
     const QPixmap& piece(NineSlice::Piece piece) const { return m_pieces[piece]; }

@@ -73,7 +73,10 @@ inline const QColor TAB_BOTTOM(34, 34, 34);
 inline const QColor CHECKER_LIGHT(120, 120, 120);
 inline const QColor CHECKER_DARK(88, 88, 88);
 constexpr int CHECKER_CELL = 16;
-constexpr int CHECKER_CELL_SMALL = 8;
+// Under small pictures. Saved ones carry the same checker in them, which lies in the data path.
+inline const QColor PICTURE_CHECKER_LIGHT(153, 153, 153);
+inline const QColor PICTURE_CHECKER_DARK(102, 102, 102);
+constexpr int PICTURE_CHECKER_CELL = 15;
 
 // Lengths in pixels.
 constexpr qreal STROKE = 2.0; // every line of every icon

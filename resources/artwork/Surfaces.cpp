@@ -122,14 +122,15 @@ void Surfaces::verticalGroove(QPainter& painter, const QSize& size)
     painter.fillRect(half, 0, size.width() - half, size.height(), Tokens::GROOVE_LIGHT);
 }
 
-void Surfaces::checker(QPainter& painter, const QRect& area, int cell)
+void Surfaces::checker(QPainter& painter, const QRect& area, int cell, const QColor& first,
+                       const QColor& second)
 {
     painter.save();
     painter.setClipRect(area);
-    painter.fillRect(area, Tokens::CHECKER_LIGHT);
+    painter.fillRect(area, second);
     for (int y = area.top(), row = 0; y <= area.bottom(); y += cell, ++row) {
         for (int x = area.left() + (row % 2) * cell; x <= area.right(); x += 2 * cell) {
-            painter.fillRect(x, y, cell, cell, Tokens::CHECKER_DARK);
+            painter.fillRect(x, y, cell, cell, first);
         }
     }
     painter.restore();
@@ -146,7 +147,7 @@ void Surfaces::canvasFrame(QPainter& painter, const QRect& canvas)
                             Tokens::RADIUS_PANE - 1);
     painter.setRenderHint(QPainter::Antialiasing, false);
     painter.fillRect(canvas.adjusted(-1, -1, 1, 1), Qt::black);
-    checker(painter, canvas, Tokens::CHECKER_CELL);
+    checker(painter, canvas, Tokens::CHECKER_CELL, Tokens::CHECKER_DARK, Tokens::CHECKER_LIGHT);
 }
 
 void Surfaces::caretHandle(QPainter& painter, const QSize& size, bool pressed)

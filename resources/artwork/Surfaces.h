@@ -34,7 +34,8 @@ void selectionBar(QPainter& painter, const QSize& size);
 // A groove of two lines, dark above light for a horizontal one.
 void horizontalGroove(QPainter& painter, const QSize& size);
 void verticalGroove(QPainter& painter, const QSize& size);
-void checker(QPainter& painter, const QRect& area, int cell);
+// The cell in the upper left corner is of the first colour.
+void checker(QPainter& painter, const QRect& area, int cell, const QColor& first, const QColor& second);
 // The canvas frame of the window; the canvas lies at the given rectangle.
 void canvasFrame(QPainter& painter, const QRect& canvas);
 // The handle under a text caret, its point up.

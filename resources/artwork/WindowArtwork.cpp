@@ -46,9 +46,10 @@ void Families::addWindow(QList<Picture>& table)
                 Surfaces::caretHandle(painter, size, pressed);
             });
     }
-    const QSize tile(2 * Tokens::CHECKER_CELL_SMALL, 2 * Tokens::CHECKER_CELL_SMALL);
+    const QSize tile(2 * Tokens::PICTURE_CHECKER_CELL, 2 * Tokens::PICTURE_CHECKER_CELL);
     add(QStringLiteral("checker"), tile, [](QPainter& painter, const QSize& size) {
-        Surfaces::checker(painter, QRect(QPoint(0, 0), size), Tokens::CHECKER_CELL_SMALL);
+        Surfaces::checker(painter, QRect(QPoint(0, 0), size), Tokens::PICTURE_CHECKER_CELL,
+                          Tokens::PICTURE_CHECKER_LIGHT, Tokens::PICTURE_CHECKER_DARK);
     });
     for (const char* name : {"FolderPicker/Titler_folder_icon", "FolderPicker/Picker_Icon_Enabel"}) {
         add(QString::fromLatin1(name), QSize(28, 28),

@@ -321,6 +321,9 @@ void TestToolsBar::menuOpensUnderTheButton()
     QSignalSpy shown(m_bar, &ToolsBar::signalShowCanvasMenu);
     openMenu();
     QCOMPARE(menu()->size(), QSize(200, 210));
+    QVERIFY(!menu()->mask().contains(QPoint(0, 0))); // black without a compositor
+    QVERIFY(!menu()->mask().contains(QPoint(199, 209)));
+    QVERIFY(menu()->mask().contains(QPoint(100, 100)));
     QCOMPARE(menu()->pos(), button("Canvas")->mapToGlobal(QPoint(-7, 67 - 9)));
     QCOMPARE(button("Canvas")->buttonState(), KSPushbutton::ButtonSelectedRest);
     QCOMPARE(shown.constLast().at(0).toBool(), true);

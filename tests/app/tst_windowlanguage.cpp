@@ -2,6 +2,7 @@
 #include "Siblings.h"
 #include "app/APPEventFilter.h"
 #include "app/TitlerWindow.h"
+#include "library/ArchiveList.h"
 #include "touchui/KSInputContext.h"
 #include "touchui/KSPushbutton.h"
 
@@ -19,6 +20,7 @@ private Q_SLOTS:
     void initTestCase();
     void cleanupTestCase();
     void missingTranslationLeavesTheLanguage();
+    void listKeepsItsPlace();
 
 private:
     QTemporaryDir mPrefix;
@@ -64,6 +66,20 @@ void tst_WindowLanguage::missingTranslationLeavesTheLanguage()
     QVERIFY(shows("完成"));
     mWindow->editAndDoneButtonClicked();
     QVERIFY(shows("移动"));
+}
+
+// Its frame is painted at a fixed place of the window.
+void tst_WindowLanguage::listKeepsItsPlace()
+{
+    mWindow->show();
+    QVERIFY(QTest::qWaitForWindowExposed(mWindow.get()));
+    const auto* list = mWindow->findChild<ArchiveList*>();
+    for (const auto language :
+         {SystemSetupDef::emSystemLanguageEnglish, SystemSetupDef::emSystemLanguageChinese}) {
+        mWindow->slotSystemLanguageChanged(language);
+        QCoreApplication::processEvents();
+        QCOMPARE(QRect(list->mapTo(mWindow.get(), QPoint(0, 0)), list->size()), QRect(14, 64, 549, 997));
+    }
 }
 
 int main(int argc, char** argv)

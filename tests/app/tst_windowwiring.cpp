@@ -181,6 +181,7 @@ void tst_WindowWiring::panel()
     ROW(mScene, CanvasScene::signalSceneNotifyTextPropertyAreaObjectSelectionMode, mPanel,
         TextToolsPanel::selectionModeForShadowAndAlign);
     ROW(mScene, CanvasScene::signalBeginNewTextItem, mPanel, TextToolsPanel::slotBeginNewTextItem);
+    ROW(mScene, CanvasScene::signalEndPreview, mPanel, TextToolsPanel::slotEndPreview);
     ROW(mScene, CanvasScene::signalSceneSoftWareClosedWhenEditObject, mPanel,
         TextToolsPanel::slotHideColorPaletteWhenCloseSoftWare);
     ROW(mPanel, TextToolsPanel::signalShowEdgeSlider, mWindow, TitlerWindow::slotShowEdgeSlider);

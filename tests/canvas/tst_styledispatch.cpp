@@ -3,6 +3,8 @@
 
 #include "canvas/StyleComparison.h"
 
+#include <QInputMethodEvent>
+
 // Style changes as the panel sends them: every property at every scope, previews, and what comes back.
 class tst_styledispatch : public QObject
 {
@@ -30,6 +32,7 @@ private Q_SLOTS:
     void mixedColoursComeBack();
     void sizesStepFromMixedSelections();
     void previewLeftByTyping();
+    void inputMethodKeepsTheStyles();
     void movedCaretForgetsTheStyle();
     void styleAfterTyping();
     void unknownProperty();
@@ -462,12 +465,53 @@ void tst_styledispatch::previewLeftByTyping()
     TText preview = sent(*item, GraphicsText::PropertyColor, 0);
     canvas.scene->slotChangeObjectTextStyle(&preview, GraphicsText::PropertyColor, 0);
     typeTextAt(*item, 4, "e");
-    QCOMPARE(item->getItemTText()->textItems()[4]->getFontColor(), std::string("#AA0000"));
+    for (const TextStyle* style : item->getItemTText()->textItems())
+        QCOMPARE(style->getFontColor(), std::string("#FFFFFF"));
     item->pushLastEditTextIntoStack();
     while (canvas.stack.canUndo())
         canvas.stack.undo();
     QCOMPARE(item->toPlainText(), QStringLiteral("abcd"));
     QVERIFY(inStep(*item));
+}
+
+// An empty event comes when move mode begins; the document reports the whole paragraph each time.
+void tst_styledispatch::inputMethodKeepsTheStyles()
+{
+    Canvas canvas;
+    TText record = makeRecord("abc\ndef");
+    const char* const colors[] = {"#C80000", "#0D5EFF", "#FFF700", "#FFFFFF",
+                                  "#00C743", "#F250B2", "#393939"};
+    for (size_t i = 0; i < record.textItems().size(); ++i)
+        record.textItems()[i]->setFontColor(colors[i]);
+    canvas.open({record});
+    GraphicsText* item = canvas.text(1);
+    item->initNewTextSelectAll();
+    QTextCursor cursor = item->textCursor();
+    cursor.setPosition(2);
+    item->setTextCursor(cursor);
+    canvas.scene->setFocusItem(item);
+    const QStringList before = stylesOf(*item);
+    const auto send = [&](const QString& composed, const QString& committed) {
+        QInputMethodEvent event(composed, {});
+        event.setCommitString(committed);
+        QCoreApplication::sendEvent(canvas.scene.get(), &event);
+    };
+    send(QString(), QString());
+    send(QStringLiteral("x"), QString());
+    send(QStringLiteral("xy"), QString());
+    QCOMPARE(stylesOf(*item), before);
+    QCOMPARE(item->toPlainText(), QStringLiteral("abc\ndef"));
+    send(QString(), QStringLiteral("快"));
+    QCOMPARE(item->toPlainText(), QStringLiteral("ab快c\ndef"));
+    QVERIFY(inStep(*item));
+    QStringList after = stylesOf(*item);
+    QCOMPARE(item->getItemTText()->textItems()[2]->getFontColor(), std::string("#0D5EFF"));
+    after.removeAt(2);
+    QCOMPARE(after, before);
+    item->pushLastEditTextIntoStack();
+    QCOMPARE(canvas.stack.count(), 1);
+    canvas.stack.undo();
+    QCOMPARE(stylesOf(*item), before);
 }
 
 void tst_styledispatch::movedCaretForgetsTheStyle()

@@ -47,7 +47,7 @@ TEMPLATE_BUTTONS = {"Select": (1285, 907), "Cancel": (1514, 907), "Delete": (149
 # The folder picker: the middle of its first row and of its buttons.
 PICKER_ROW = (800, 306)
 PICKER_ROW_HEIGHT = 48
-PICKER_BUTTONS = {"Duplicate": (513, 857), "New Folder": (681, 857), "Open": (1247, 857), "Cancel": (1415, 857)}
+PICKER_BUTTONS = {"Duplicate": (513, 857), "New Folder": (681, 857), "Open": (1239, 857), "Cancel": (1407, 857)}
 # Points of the pickers' Cancel buttons beside the text, which are brighter than anything else of the window there.
 PICKER_LIT, TEMPLATES_LIT, LIT = (1350, 840), (1454, 890), 65
 PICTURES = {"_1920.png": (1920, 1080), "_960.png": (960, 540), "_240.png": (240, 135), "_240S.png": (240, 135)}

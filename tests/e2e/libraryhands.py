@@ -8,7 +8,7 @@ ORDER_NOTICE = ("FileManagerController", "updateTitlerOrder")
 HANDLE = (540, 133)
 MOVE = (520, 36)
 # From the middle of a folder's row in the picker to what opens it.
-EXPANDER = (-87, 0)
+EXPANDER = (-95, 0)
 
 
 class LibraryTest(harness.TitlerTest):

@@ -15,7 +15,8 @@ SHOWN, HIDDEN = 1, 2
 # Where a new text begins on the canvas, and how far the hand may be off.
 NEW_TEXT, HAND = (590.5, 323.5), 12
 TEMPLATE_ORDER = "resources/TitlerTemplates/.order.xml"
-SETTINGS = {"settings/TitlerLastPathSetting.xml", "resources/Templates/templates_en/TitlerLastPathSetting.xml"}
+SETTINGS = {"settings/TitlerLastPathSetting.xml", "resources/Templates/templates_en/TitlerLastPathSetting.xml",
+            "resources/TitlerTemplates/TitlerLastPathSetting.xml"}
 
 
 class Library(LibrarySession):

@@ -69,6 +69,18 @@ private Q_SLOTS:
         QCOMPARE(sizeLabel()->text(), QString());
     }
 
+    // The frame's line is the last but seven columns.
+    void nothingTouchesTheFrame()
+    {
+        f.open();
+        const int line = FolderPicker::FOLDER_PICKER_SIZE.width() - 8;
+        for (const char* name : {"folderTree", "cancelFolderButton"}) {
+            const auto* widget = f.picker->findChild<QWidget*>(QLatin1String(name));
+            QVERIFY2(widget->geometry().right() < line - 8, name);
+            QVERIFY2(widget->geometry().left() > 8 + 7, name);
+        }
+    }
+
     void picturesThatAreNone()
     {
         f.make("news", {"gone", "torn", "folder"});

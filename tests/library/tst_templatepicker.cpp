@@ -153,6 +153,30 @@ private Q_SLOTS:
         QVERIFY(users()->scrollArea()->viewport()->width() >= 4 * 248 + 3 * 10);
     }
 
+    void textsStandInTheirBox()
+    {
+        mFixture.makeUserTemplate("UserTemplate_001", {"Evening News"});
+        openUserTab();
+        QCOMPARE(preview()->size().width(), fileName()->width());
+        QCOMPARE(preview()->x(), fileName()->x());
+        const QWidget* tabs = users()->parentWidget()->parentWidget();
+        const int right = preview()->mapTo(tabs, QPoint(preview()->width(), 0)).x();
+        QVERIFY2(right <= TemplatePicker::TAB_AREA_WIDTH - 2 - 4, qPrintable(QString::number(right)));
+        for (const QLabel* line : preview()->getRightChild()->findChildren<QLabel*>()) {
+            QVERIFY(line->contentsRect().left() >= 8);
+            QVERIFY(line->contentsRect().right() <= preview()->width() - 8);
+        }
+    }
+
+    void cornersAreNotPartOfTheDialog()
+    {
+        open();
+        QVERIFY(!mPicker->mask().isEmpty());
+        QVERIFY(!mPicker->mask().contains(QPoint(0, 0)));
+        QVERIFY(!mPicker->mask().contains(QPoint(mPicker->width() - 1, mPicker->height() - 1)));
+        QVERIFY(mPicker->mask().contains(mPicker->rect().center()));
+    }
+
     void aTapChoosesAndSelectTakes()
     {
         mFixture.makePresets("templates_en", {"a", "b", "c"}, true);
@@ -346,9 +370,19 @@ private Q_SLOTS:
         QCOMPARE(users()->archive(3)->getOrder(), std::string("4"));
         QCOMPARE(mFixture.userOrder().last(), QString("UserTemplate_004"));
         QCOMPARE(users()->item(3)->getIndex(), 3);
-        tapItem(users(), 3);
+        // The new one is chosen, whichever was before, and remembered.
+        QCOMPARE(users()->selectedItem(), users()->item(3));
+        QVERIFY(users()->item(3)->hasSelectedStyle());
+        QVERIFY(button("selectUserButton")->isEnabled() && button("deleteTemplateButton")->isEnabled());
         QCOMPARE(preview()->textLines().first(), QString("saved"));
         QCOMPARE(fileName()->text(), QString("UserTemplate_004"));
+        tapItem(users(), 1);
+        mFixture.makeUserTemplate("UserTemplate_005");
+        mPicker->slotSaveAsTemplate("UserTemplate_005");
+        QVERIFY(!users()->item(1)->hasSelectedStyle());
+        QCOMPARE(users()->selectedItem(), users()->item(4));
+        mPicker->reloadTemplates2();
+        QCOMPARE(TemplateTab::templateName(*users()->selectedArchive()), QString("UserTemplate_005"));
     }
 
     void imports()

@@ -179,6 +179,8 @@ void tst_TemplateProperty::save()
     makeYoungest(name);
     mPicker->slotSaveAsTemplate(name);
     mNames.append(name);
+    mChosen = name;
+    mLastChosen = name;
 }
 
 void tst_TemplateProperty::importNew()

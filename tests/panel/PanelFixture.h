@@ -109,6 +109,39 @@ inline TText plainText(const QString& letters = QStringLiteral("Abc"))
     return text;
 }
 
+// Three characters that differ in everything.
+inline TText mixedText()
+{
+    TText text = plainText();
+    const char* const families[] = {"KST", "DejaVu Sans", "DejaVu Serif"};
+    const char* const colors[] = {"#C80000", "#123456", "#FFF700"};
+    for (int i = 0; i < 3; ++i) {
+        TextStyle* item = text.textItems().at(size_t(i));
+        item->setFontFamily(families[i]);
+        item->setFontColor(colors[i]);
+        item->setFontSize(64 - 24 * (i % 2));
+        item->setFontBold(i == 0 ? 1 : 0);
+        item->setIsTextItalic(i == 2 ? 1 : 0);
+        item->setTextKerning(80 + 20 * i);
+        item->setIsTextEdge(i == 2 ? 1 : 0);
+        TEdge edge;
+        edge.setEdgeColor(colors[2 - i]);
+        edge.setEdgeWidth(i + 3);
+        item->setTextEdge(edge);
+    }
+    text.setTextAlign(1);
+    text.setShadowStyle(2);
+    return text;
+}
+
+inline QList<QString> colorsOf(const TText& text)
+{
+    QList<QString> colors;
+    for (const TextStyle* item : text.textItems())
+        colors << QString::fromStdString(item->getFontColor());
+    return colors;
+}
+
 // What the panel sent last: a copy, since the record lives during the signal only.
 struct SentStyle {
     TText style;

@@ -23,7 +23,6 @@ private Q_SLOTS:
     void okSendsTheChoice();
     void cancelSendsWhatWasThere();
     void escapeIsCancel();
-    void closingSendsNothing();
     void pressedLook();
     void dragRules_data();
     void dragRules();
@@ -147,14 +146,6 @@ void TestColorPalette::escapeIsCancel()
     QCOMPARE(*m_sent, (QList<QVariantList>{{"#273F69", 2}}));
     m_palette->reject(); // closed already
     QCOMPARE(m_sent->size(), 1);
-}
-
-void TestColorPalette::closingSendsNothing()
-{
-    m_palette->setCurrentColor(QStringLiteral("#273F69"));
-    m_palette->closePalette();
-    QVERIFY(!m_palette->isVisible());
-    QVERIFY(m_sent->isEmpty());
 }
 
 void TestColorPalette::pressedLook()

@@ -4,8 +4,6 @@
 #include "document/SettingManager.h"
 #include "panel/AlignToolBox.h"
 #include "panel/BoldToolBox.h"
-#include "panel/ColorButton.h"
-#include "panel/ColorPalette.h"
 #include "panel/EdgeSizeSlider.h"
 #include "panel/EdgeToolBox.h"
 #include "panel/FamilyToolBox.h"
@@ -48,13 +46,6 @@ private Q_SLOTS:
     void mixedBoldTurnsAllOn();
     void recordWithoutCharactersIsIgnored();
     void previewKeepsTheSlidersPlace();
-    void textPaletteOk();
-    void textPaletteCancelWithMixedColors();
-    void edgePaletteCancelWithMixedColors();
-    void paletteFollowsTheSelection();
-    void otherPaletteCancelsTheFirst();
-    void keyboardClosesThePalette();
-    void paletteStandsInTheWindow();
     void enableRules();
     void selectionModes();
     void newTextTakesWhatIsShown();
@@ -73,8 +64,6 @@ private:
     {
         return m_panel->find<Box>();
     }
-    TText mixed() const;
-    static QList<QString> colorsOf(const TText& text);
 
     std::unique_ptr<PanelEnvironment> m_environment;
     std::unique_ptr<Panel> m_panel;
@@ -92,39 +81,6 @@ void TestTextToolsPanel::init()
 void TestTextToolsPanel::cleanup()
 {
     m_panel.reset();
-}
-
-// Three characters that differ in everything.
-TText TestTextToolsPanel::mixed() const
-{
-    TText text = plainText();
-    const char* const families[] = {"KST", "DejaVu Sans", "DejaVu Serif"};
-    const char* const colors[] = {"#C80000", "#123456", "#FFF700"};
-    for (int i = 0; i < 3; ++i) {
-        TextStyle* item = text.textItems().at(size_t(i));
-        item->setFontFamily(families[i]);
-        item->setFontColor(colors[i]);
-        item->setFontSize(64 - 24 * (i % 2));
-        item->setFontBold(i == 0 ? 1 : 0);
-        item->setIsTextItalic(i == 2 ? 1 : 0);
-        item->setTextKerning(80 + 20 * i);
-        item->setIsTextEdge(i == 2 ? 1 : 0);
-        TEdge edge;
-        edge.setEdgeColor(colors[2 - i]);
-        edge.setEdgeWidth(i + 3);
-        item->setTextEdge(edge);
-    }
-    text.setTextAlign(1);
-    text.setShadowStyle(2);
-    return text;
-}
-
-QList<QString> TestTextToolsPanel::colorsOf(const TText& text)
-{
-    QList<QString> colors;
-    for (const TextStyle* item : text.textItems())
-        colors << QString::fromStdString(item->getFontColor());
-    return colors;
 }
 
 void TestTextToolsPanel::withoutAStyleNothingHappens()
@@ -184,7 +140,7 @@ void TestTextToolsPanel::changesByTap()
 
 void TestTextToolsPanel::sizesGoToTheirCharacters()
 {
-    m_panel->select(mixed());
+    m_panel->select(mixedText());
     m_panel->tap("Icon_SizeUp");
     const auto& items = m_panel->sent.first().style.textItems();
     QCOMPARE(items[0]->getFontSize(), 66);
@@ -238,7 +194,7 @@ void TestTextToolsPanel::edgeKindsKeepTheRest()
     TEdge edge;
     edge.setEdgeWidth(9);
     edge.setEdgeColor("#00C743");
-    const TText before = mixed();
+    const TText before = mixedText();
     for (const int kind : {1, 2, 3, 4}) {
         m_panel->select(before);
         m_panel->panel->changeEdge(1, edge, 7, 1, kind);
@@ -357,7 +313,7 @@ void TestTextToolsPanel::copyIsOnlyLent()
 
 void TestTextToolsPanel::mixedSelectionShows()
 {
-    m_panel->select(mixed());
+    m_panel->select(mixedText());
     QCOMPARE(box<FamilyToolBox>()->getFontFamily(), QString());
     QCOMPARE(box<SizeToolBox>()->findChild<QLineEdit*>()->text(), QStringLiteral("40+"));
     QCOMPARE(box<BoldToolBox>()->getFontBold(), 0);
@@ -386,7 +342,7 @@ void TestTextToolsPanel::mixedSelectionShows()
 void TestTextToolsPanel::showingSendsNothing()
 {
     for (int round = 0; round < 3; ++round) {
-        TText first = mixed();
+        TText first = mixedText();
         TText second = plainText();
         m_panel->panel->updateTextStyle(&first);
         m_panel->panel->updateTextStyle(&second);
@@ -401,7 +357,7 @@ void TestTextToolsPanel::showingSendsNothing()
 
 void TestTextToolsPanel::mixedBoldTurnsAllOn()
 {
-    m_panel->select(mixed());
+    m_panel->select(mixedText());
     m_panel->tap("Icon_Bold");
     for (const TextStyle* item : m_panel->sent.last().style.textItems())
         QCOMPARE(item->isFontBold(), 1);
@@ -414,7 +370,7 @@ void TestTextToolsPanel::mixedBoldTurnsAllOn()
 
 void TestTextToolsPanel::recordWithoutCharactersIsIgnored()
 {
-    m_panel->select(mixed());
+    m_panel->select(mixedText());
     TText empty;
     m_panel->panel->updateTextStyle(&empty);
     QCOMPARE(m_panel->panel->workingStyle()->textItems().size(), size_t(3));
@@ -441,116 +397,6 @@ void TestTextToolsPanel::previewKeepsTheSlidersPlace()
     edge->hideEdgeSliderMenu();
     QCOMPARE(m_panel->sent.last().style.textItems()[0]->getTextEdge().getEdgeWidth(), 8);
     disconnect(m_panel->panel, &TextToolsPanel::textStyleChange, this, nullptr);
-}
-
-void TestTextToolsPanel::textPaletteOk()
-{
-    m_panel->select(mixed());
-    m_panel->tap("TextColor");
-    auto* palette = m_panel->find<ColorPalette>();
-    QTRY_VERIFY(palette->isVisible());
-    QCOMPARE(palette->currentColor(), QStringLiteral("#FFF700"));
-    m_environment->tap(palette->findChildren<ColorButton*>().at(4));
-    QCOMPARE(m_panel->sent.last().id, 4);
-    QCOMPARE(m_panel->sent.last().undoFlag, 0);
-    QCOMPARE(colorsOf(m_panel->sent.last().style), (QList<QString>{"#000000", "#000000", "#000000"}));
-    m_panel->tap("PaletteOK");
-    QCOMPARE(m_panel->sent.last().undoFlag, 1);
-    QCOMPARE(colorsOf(m_panel->sent.last().style), (QList<QString>{"#000000", "#000000", "#000000"}));
-    QCOMPARE(m_panel->sent.size(), 2);
-    QCOMPARE(m_environment->newLogLines(),
-             (QStringList{"[Text Property Area] 200: Adjust Font Color to #000000",
-                          "[Text Property Area] 200: Adjust Font Color to #000000"}));
-    QVERIFY(!palette->isVisible());
-}
-
-void TestTextToolsPanel::textPaletteCancelWithMixedColors()
-{
-    // As the canvas does: every change comes back.
-    connect(m_panel->panel, &TextToolsPanel::textStyleChange, this, [this](TText* style, int, int) {
-        TText answer(*style);
-        m_panel->panel->updateTextStyle(&answer);
-    });
-    const TText before = mixed();
-    m_panel->select(before);
-    m_panel->tap("TextColor");
-    auto* palette = m_panel->find<ColorPalette>();
-    QTRY_VERIFY(palette->isVisible());
-    for (const int index : {4, 20, 29})
-        m_environment->tap(palette->findChildren<ColorButton*>().at(index));
-    m_panel->tap("PaletteCancel");
-    QCOMPARE(m_panel->sent.last().undoFlag, 2);
-    QCOMPARE(colorsOf(m_panel->sent.last().style), colorsOf(before));
-    QCOMPARE(m_panel->sent.size(), 4);
-    QVERIFY(m_panel->sent.last().style.textItemsIsTheSame(before));
-    disconnect(m_panel->panel, &TextToolsPanel::textStyleChange, this, nullptr);
-}
-
-void TestTextToolsPanel::edgePaletteCancelWithMixedColors()
-{
-    const TText before = mixed();
-    m_panel->select(before);
-    m_panel->tap("EdgeColor");
-    auto* palette = m_panel->find<ColorPalette>();
-    QTRY_VERIFY(palette->isVisible());
-    m_environment->tap(palette->findChildren<ColorButton*>().at(0));
-    for (const TextStyle* item : m_panel->sent.last().style.textItems())
-        QCOMPARE(item->getTextEdge().getEdgeColor(), std::string("#FFFFFF"));
-    QCOMPARE((QList<int>{m_panel->sent.last().id, m_panel->sent.last().undoFlag}), (QList<int>{7, 0}));
-    m_panel->tap("PaletteCancel");
-    QCOMPARE((QList<int>{m_panel->sent.last().id, m_panel->sent.last().undoFlag}), (QList<int>{7, 2}));
-    QVERIFY(m_panel->sent.last().style.textItemsIsTheSame(before));
-    QCOMPARE(colorsOf(m_panel->sent.last().style), colorsOf(before)); // the text's colours stay
-}
-
-void TestTextToolsPanel::paletteFollowsTheSelection()
-{
-    m_panel->select(mixed());
-    m_panel->tap("TextColor");
-    auto* palette = m_panel->find<ColorPalette>();
-    QTRY_VERIFY(palette->isVisible());
-    TText other = plainText(QStringLiteral("Ab"));
-    other.textItems()[0]->setFontColor("#C80000");
-    other.textItems()[1]->setFontColor("#00C743");
-    m_panel->select(other);
-    QCOMPARE(palette->currentColor(), QStringLiteral("#00C743"));
-    m_panel->tap("PaletteCancel");
-    QCOMPARE(colorsOf(m_panel->sent.last().style), (QList<QString>{"#C80000", "#00C743"}));
-}
-
-void TestTextToolsPanel::otherPaletteCancelsTheFirst()
-{
-    m_panel->select(mixed());
-    m_panel->tap("TextColor");
-    auto* palette = m_panel->find<ColorPalette>();
-    QTRY_VERIFY(palette->isVisible());
-    m_environment->tap(palette->findChildren<ColorButton*>().at(4));
-    palette->move(80, 460); // off the panel
-    m_panel->tap("EdgeColor");
-    QCOMPARE((QList<int>{m_panel->sent.last().id, m_panel->sent.last().undoFlag}), (QList<int>{4, 2}));
-    QVERIFY(palette->isVisible());
-    m_environment->tap(palette->findChildren<ColorButton*>().at(4));
-    QCOMPARE(m_panel->sent.last().id, 7);
-}
-
-void TestTextToolsPanel::keyboardClosesThePalette()
-{
-    m_panel->select(mixed());
-    m_panel->tap("TextColor");
-    QTRY_VERIFY(m_panel->panel->colorPaletteIsShown());
-    m_panel->panel->slotHideColorPaletteWhenCloseSoftWare();
-    QVERIFY(!m_panel->panel->colorPaletteIsShown());
-    QVERIFY(m_panel->sent.isEmpty());
-}
-
-void TestTextToolsPanel::paletteStandsInTheWindow()
-{
-    m_panel->select(plainText());
-    m_panel->panel->titlerWindowRectSlot(QRect(1280, 0, 1920, 1080));
-    m_panel->tap("TextColor");
-    auto* palette = m_panel->find<ColorPalette>();
-    QTRY_VERIFY(palette->isVisible());
-    QCOMPARE(palette->pos(), QPoint(1920, 350));
 }
 
 void TestTextToolsPanel::enableRules()
@@ -634,7 +480,7 @@ void TestTextToolsPanel::newTextWithoutAFamily()
     connect(m_panel->panel, &TextToolsPanel::signalUpdateCurrentTextProperty, this,
             [&family](TText& style) { family = style.textItems().front()->getFontFamily(); });
     m_panel->panel->displayInputLanguage(SystemSetupDef::emInputLanguageJapanese);
-    m_panel->select(mixed());
+    m_panel->select(mixedText());
     m_panel->panel->slotBeginNewTextItem();
     QCOMPARE(family, std::string("KST Japanese Pro"));
     disconnect(m_panel->panel, &TextToolsPanel::signalUpdateCurrentTextProperty, this, nullptr);
@@ -669,7 +515,7 @@ void TestTextToolsPanel::styleIsRemembered()
 
 void TestTextToolsPanel::movesAndPreviewsAreNotRemembered()
 {
-    m_panel->select(mixed());
+    m_panel->select(mixedText());
     m_panel->tap("Icon_MoveUp");
     m_panel->panel->changeTextColor(QStringLiteral("#00C743"), 4, 0);
     FontStyle style;
@@ -710,7 +556,7 @@ void TestTextToolsPanel::halfTypedSizeIsDropped_data()
 void TestTextToolsPanel::halfTypedSizeIsDropped()
 {
     QFETCH(QString, button);
-    m_panel->select(mixed());
+    m_panel->select(mixedText());
     auto* edit = box<SizeToolBox>()->findChild<QLineEdit*>();
     m_environment->touch(edit->parentWidget(), edit->geometry().center());
     QVERIFY(box<SizeToolBox>()->isEditing());

@@ -17,6 +17,7 @@
 
 #include <QLabel>
 #include <QRadioButton>
+#include <QTextLayout>
 #include <QVBoxLayout>
 
 class TestToolBoxes : public QObject
@@ -45,6 +46,8 @@ private Q_SLOTS:
     void edgeSliderReturnedIsNoStep();
     void edgeSliderClosesByATouchBeside();
     void edgeSliderIsFramedAllRound();
+    void edgeSliderHasNoCorners();
+    void rangeOfMoveBreaksInTheMiddle();
     void edgeColorStates();
     void textColorStates();
     void colorButtonText();
@@ -358,6 +361,45 @@ void TestToolBoxes::edgeSliderClosesByATouchBeside()
     QVERIFY(spy.isEmpty());
     tap("Icon_EdgeOff");
     QCOMPARE(spy.size(), 1);
+}
+
+// Without a compositor they would be black.
+void TestToolBoxes::edgeSliderHasNoCorners()
+{
+    auto* edge = show<EdgeToolBox>();
+    edge->slider()->popup(QPoint(100, 100));
+    QVERIFY(QTest::qWaitForWindowExposed(edge->slider()));
+    QVERIFY(!edge->slider()->mask().contains(QPoint(0, 0)));
+    QVERIFY(!edge->slider()->mask().contains(edge->slider()->rect().bottomRight()));
+    QCOMPARE(edge->slider()->mask().boundingRect(), edge->slider()->rect());
+    edge->hideEdgeSliderMenu();
+}
+
+// No word stands on a line alone when it could have company.
+void TestToolBoxes::rangeOfMoveBreaksInTheMiddle()
+{
+    m_window->setStyleSheet(QStringLiteral(" * {font-family:'KST';}")); // as the window does
+    const auto* box = show<RangeOfMoveText>();
+    for (const char* family : {"KST", "DFHeiW5-A", "DejaVu Sans"}) {
+        m_window->setStyleSheet(QStringLiteral(" * {font-family:'%1';}").arg(QLatin1String(family)));
+        const auto labels = box->findChildren<QLabel*>();
+        const auto found =
+            std::find_if(labels.begin(), labels.end(), [](const QLabel* label) { return label->wordWrap(); });
+        QVERIFY(found != labels.end());
+        const QLabel& label = **found;
+        QCOMPARE(label.text(), QStringLiteral("Range of move per 1 tap"));
+        QTextLayout layout(label.text(), label.font());
+        layout.beginLayout();
+        QList<qreal> widths;
+        for (QTextLine line = layout.createLine(); line.isValid(); line = layout.createLine()) {
+            line.setLineWidth(label.contentsRect().width());
+            widths.append(line.naturalTextWidth());
+        }
+        layout.endLayout();
+        QCOMPARE(widths.size(), 2);
+        QVERIFY2(widths.at(1) > widths.at(0) / 2, family);
+        QVERIFY2(widths.at(0) <= label.contentsRect().width(), family);
+    }
 }
 
 void TestToolBoxes::edgeColorStates()

@@ -85,6 +85,7 @@ private Q_SLOTS:
     void initTestCase();
     void thePathFileHasEveryNode();
     void checkersHaveTwoShades();
+    void checkerIsThatOfTheList();
     void sampleTitlesAreWhole();
     void samplesShowFourScriptsAnOutlineAndAShadow();
     void templatesAreReadInBothLanguages();
@@ -141,6 +142,21 @@ void tst_titlerprovision::checkersHaveTwoShades()
         QCOMPARE(checker.size(), size);
         QVERIFY(checker.pixel(0, 0) != checker.pixel(15, 0));
         QCOMPARE(checker.pixel(0, 0), checker.pixel(15, 15));
+    }
+}
+
+// A title that is edited lies on the program's own checker, a saved one on that of the data path.
+void tst_titlerprovision::checkerIsThatOfTheList()
+{
+    Q_INIT_RESOURCE(TitlerToolResource);
+    const QImage saved(mBase + "resources/Templates/checker_240x135.png");
+    const QImage tile(QStringLiteral(":/checker"));
+    QVERIFY(!tile.isNull());
+    for (int y = 0; y < saved.height(); ++y) {
+        for (int x = 0; x < saved.width(); ++x) {
+            const QColor wanted = tile.pixelColor(x % tile.width(), y % tile.height());
+            QVERIFY2(saved.pixelColor(x, y) == wanted, qPrintable(QString("%1, %2").arg(x).arg(y)));
+        }
     }
 }
 

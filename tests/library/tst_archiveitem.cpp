@@ -1,0 +1,122 @@
+// The text lines of one title in the list: where they break, and the room that the handle of move mode takes.
+#include "LibraryFixture.h"
+
+#include "library/ArchiveItem.h"
+
+#include <QFontMetricsF>
+#include <QLabel>
+#include <QTest>
+
+class TestArchiveItem : public QObject
+{
+    Q_OBJECT
+
+private Q_SLOTS:
+    void initTestCase();
+    void init();
+    void cleanup() { mItem.reset(); }
+    void oneTextRunsOverTheLines();
+    void wordLongerThanALine();
+    void onlyTheLastLineIsElided();
+    void handleStandsBesideTheText();
+
+private:
+    void show(const QString& text);
+    QList<QLabel*> labels() const { return mItem->getRightChild()->findChildren<QLabel*>(); }
+    static bool fits(const QLabel& label)
+    {
+        return QFontMetricsF(label.font()).horizontalAdvance(label.text()) <= label.contentsRect().width();
+    }
+
+    LibraryFixture mFixture;
+    Archive mArchive;
+    std::unique_ptr<ArchiveItem> mItem;
+};
+
+namespace
+{
+
+constexpr QChar ELLIPSIS(0x2026);
+
+} // namespace
+
+void TestArchiveItem::initTestCase()
+{
+    Q_INIT_RESOURCE(UILibrary);
+    Q_INIT_RESOURCE(TitlerToolResource);
+}
+
+void TestArchiveItem::init()
+{
+    mItem = std::make_unique<ArchiveItem>(&mArchive, ArchiveItem::LIST_ITEM);
+    mItem->setDragFlagAlignment(DRAGFLAG_RIGHT);
+}
+
+void TestArchiveItem::show(const QString& text)
+{
+    mArchive.releaseVectorText();
+    mArchive.setText({LibraryFixture::makeText(text, 1)});
+    if (mItem->hasChildWidgets())
+        mItem->updateRightChild();
+    else
+        mItem->initArchiveItemChildWidget();
+}
+
+void TestArchiveItem::oneTextRunsOverTheLines()
+{
+    const QString text = QStringLiteral("The council votes tonight on the new bridge");
+    show(text);
+    const QStringList lines = mItem->textLines();
+    QVERIFY(!lines.at(1).isEmpty());
+    QVERIFY2(!lines.join(QString()).contains(ELLIPSIS), qPrintable(lines.join('|')));
+    QCOMPARE(lines.join(' ').simplified(), text); // no word is lost or cut
+    for (const QLabel* label : labels())
+        QVERIFY2(fits(*label), qPrintable(label->text()));
+}
+
+void TestArchiveItem::wordLongerThanALine()
+{
+    const QString text = QStringLiteral("快讯快讯快讯快讯快讯快讯快讯快讯快讯快讯");
+    show(text);
+    QCOMPARE(mItem->textLines().join(QString()), text);
+    show(QString(30, QLatin1Char('W')));
+    QCOMPARE(mItem->textLines().join(QString()), QString(30, QLatin1Char('W')));
+}
+
+void TestArchiveItem::onlyTheLastLineIsElided()
+{
+    const QString text = QStringLiteral("word ").repeated(60).trimmed();
+    show(text);
+    QStringList lines = mItem->textLines();
+    QCOMPARE(lines.size(), 4);
+    QVERIFY2(lines.last().endsWith(ELLIPSIS), qPrintable(lines.last()));
+    lines.last().chop(1);
+    QVERIFY(text.startsWith(lines.join(' ').simplified()));
+    QVERIFY(!lines.join(QString()).contains(ELLIPSIS));
+    for (const QLabel* label : labels())
+        QVERIFY2(fits(*label), qPrintable(label->text()));
+}
+
+void TestArchiveItem::handleStandsBesideTheText()
+{
+    show(QStringLiteral("word ").repeated(60));
+    const QStringList before = mItem->textLines();
+    mItem->setDragFlag(true);
+    const auto* handle = mItem->findChild<QLabel*>(QString(), Qt::FindDirectChildrenOnly);
+    QVERIFY(handle);
+    for (const QLabel* label : labels()) {
+        const QRect line(label->mapTo(mItem.get(), QPoint(0, 0)), label->size());
+        QVERIFY2(!line.intersects(handle->geometry()), qPrintable(label->text()));
+        QVERIFY2(fits(*label), qPrintable(label->text()));
+    }
+    // What comes while the list is being rearranged keeps off, too.
+    show(QStringLiteral("other ").repeated(60));
+    for (const QLabel* label : labels())
+        QVERIFY2(fits(*label), qPrintable(label->text()));
+    show(QStringLiteral("word ").repeated(60));
+    mItem->setDragFlag(false);
+    QCOMPARE(mItem->textLines(), before);
+}
+
+QTEST_MAIN(TestArchiveItem)
+#include "tst_archiveitem.moc"
