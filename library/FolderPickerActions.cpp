@@ -499,11 +499,15 @@ void FolderPicker::doEdit(const QString& name, const QModelIndex& index)
         break;
     case FOLDER_EDIT_DUPLICATE:
         made = mController.duplicateFolder(mRootPath, mDuplicateSource, name);
+        if (!made)
+            ListMessages::post(MessageDef::MESSAGE_DISK_FULL_ON_DUPLICATE, tr("folder"));
         setAttributeAtDoEdit(index, name);
         insertChildrenIndex(index, name);
         break;
     case FOLDER_EDIT_CREATE:
         made = mController.createFolder(mRootPath, name);
+        if (!made)
+            ListMessages::post(MessageDef::MESSAGE_DISK_FULL_ON_CREATE, tr("folder"));
         setAttributeAtDoEdit(index, name);
         insertChildrenIndex(index, name);
         break;
@@ -522,6 +526,8 @@ void FolderPicker::doRename(const QString& name, const QModelIndex& index)
     if (renamed) {
         mFactory->renameFolder(mOldName, name);
         insertChildrenIndex(index, name);
+    } else if (name != mOldName) {
+        ListMessages::post(MessageDef::MESSAGE_RENAME_FAILED, name);
     }
     setAttributeAtDoEdit(index, now);
     if (ITitlerFolderReporter* reporter = ITitlerFolderReporter::instance())

@@ -54,8 +54,11 @@ bool FolderPickerController::duplicateFolder(const QString& root, const QString&
 {
     if (!QFileInfo(source).isDir() || !createFolder(root, name))
         return false;
-    copyFolderFile(QDir(source), QDir(root + QLatin1Char('/') + name));
-    return true;
+    QDir copy(root + QLatin1Char('/') + name);
+    if (copyFolderFile(QDir(source), copy))
+        return true;
+    copy.removeRecursively(); // half a copy would pass for a whole one
+    return false;
 }
 
 bool FolderPickerController::isDiskFull(const QString& path, bool withFolderSize) const
