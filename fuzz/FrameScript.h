@@ -78,7 +78,7 @@ struct FrameCall {
         put(SocketFrame::IS_CALLBACK, isCallBack);
         put(SocketFrame::SIZE, size);
         put(SocketFrame::IS_REMOTE, flags & REMOTE ? 1 : 0);
-        std::memcpy(bytes.data() + SocketFrame::HEADER_SIZE, payload.data(), length);
+        std::copy_n(payload.begin(), length, bytes.begin() + SocketFrame::HEADER_SIZE);
         if (flags & CUT)
             bytes.resize(static_cast<std::size_t>(SocketFrame::HEADER_SIZE) + length);
         return bytes;

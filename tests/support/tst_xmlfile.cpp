@@ -97,6 +97,9 @@ private Q_SLOTS:
         row("good references", "<r a=\"&#x4E2D;&#65;&amp;&other;&\">&#x41;&</r>", true);
         row("open reference", "<r a=\"&#x41\"/>", false);
         row("reference without digits", "<r>&#x;</r>", false);
+        row("reference to a surrogate", "<r a=\"&#xD800;\"/>", false);
+        row("reference beyond Unicode", "<r>&#1114112;</r>", false);
+        row("reference to the last character", "<r>&#x10FFFD;&#55295;&#0;</r>", true);
         row("byte order mark", "\xEF\xBB\xBF<r/>", true);
         row("cut sequence", "<r a=\"\xE4\xB8\"/>", false);
         row("overlong", "<r a=\"\xC0\x80\"/>", false);
