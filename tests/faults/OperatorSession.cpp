@@ -29,6 +29,7 @@
 #include <QTabWidget>
 #include <QTextCursor>
 #include <QThread>
+#include <QTimer>
 #include <unistd.h>
 
 const QString OperatorSession::FOLDER = QStringLiteral("news");
@@ -47,6 +48,7 @@ constexpr long MESSAGE_CENTER = 65;
 constexpr int SETTLE_TIMEOUT = 3000;
 constexpr int SETTLE_TIMEOUT_LATER = 300;
 constexpr std::chrono::seconds SYNC_TIMEOUT(4);
+constexpr int DIALOG_WATCH = 1; // ms
 constexpr int CLOSE_ATTEMPTS = 4;
 constexpr int SESSIONS_PER_LOOK = 5;
 
@@ -87,21 +89,21 @@ OperatorSession::OperatorSession(const QString& titleRoot) : mRoot(titleRoot)
     for (QWidget* widget : {static_cast<QWidget*>(mWindow.get()), static_cast<QWidget*>(mFolders),
                             static_cast<QWidget*>(mTemplates)})
         widget->setUpdatesEnabled(false);
-    connect(&mDialogWatch, &QTimer::timeout, this, &OperatorSession::watchDialogs);
-    mDialogWatch.start(0);
+    watchDialogs();
 }
 
 OperatorSession::~OperatorSession()
 {
-    mDialogWatch.stop();
     mWindow.reset();
     pMainWindow = nullptr;
     APPEventFilter::release();
 }
 
 // A dialog runs a loop of its own; what is to be done in it is done from there, once, and then it is left.
+// One that is opened by that has its turn, too: each look comes from a timer of its own.
 void OperatorSession::watchDialogs()
 {
+    QTimer::singleShot(DIALOG_WATCH, this, &OperatorSession::watchDialogs);
     if (mTemplates->isVisible()) {
         if (auto action = std::exchange(mInTemplates, nullptr))
             action();

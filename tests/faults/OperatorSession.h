@@ -11,7 +11,6 @@
 #include "library/ArchiveAction.h"
 
 #include <QObject>
-#include <QTimer>
 #include <functional>
 #include <memory>
 
@@ -85,7 +84,6 @@ private:
     CanvasScene* mScene = nullptr;
     FolderPicker* mFolders = nullptr;
     TemplatePicker* mTemplates = nullptr;
-    QTimer mDialogWatch;
     std::function<void()> mInFolders;
     std::function<void()> mInTemplates;
     QString mOpen;           // name of the open folder
