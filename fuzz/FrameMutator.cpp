@@ -93,6 +93,6 @@ extern "C" std::size_t LLVMFuzzerCustomMutator(std::uint8_t* data, std::size_t s
     const std::vector<std::uint8_t> bytes = FrameCall::write(calls);
     if (bytes.size() > maximum)
         return LLVMFuzzerMutate(data, size, maximum);
-    std::memcpy(data, bytes.data(), bytes.size());
+    std::copy(bytes.begin(), bytes.end(), data);
     return bytes.size();
 }

@@ -21,6 +21,6 @@ public:
     // it leaves a part.
     static bool saveInPlace(const TiXmlDocument& document, const std::string& path);
 
-    // The bytes that SaveFile writes.
+    // The bytes that SaveFile writes, those that are not UTF-8 replaced.
     static std::string toBytes(const TiXmlDocument& document);
 };

@@ -113,12 +113,12 @@ private:
         return true;
     }
 
-    // What has no UTF-8 would make a file unreadable that it is saved to.
+    // What has no UTF-8 would make a file unreadable that it is saved to; a NUL would end a name.
     static bool isCharacter(std::string_view digits, int base)
     {
         std::uint32_t code = 0;
         const auto [end, error] = std::from_chars(digits.begin(), digits.end(), code, base);
-        return error == std::errc() && code <= 0x10FFFF && (code < 0xD800 || code > 0xDFFF);
+        return error == std::errc() && code > 0 && code <= 0x10FFFF && (code < 0xD800 || code > 0xDFFF);
     }
 
     static bool isHexadecimalDigit(char c)
