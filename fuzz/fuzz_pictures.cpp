@@ -2,8 +2,12 @@
 // picture that an operator brings in. The limits on memory that the fuzzer runs with are part of the test.
 #include "FuzzFolder.h"
 #include "document/ImageResizer.h"
+#include "document/PictureReader.h"
 
 #include <QGuiApplication>
+#include <QImage>
+#include <QSize>
+#include <QString>
 #include <iterator>
 
 namespace
@@ -34,6 +38,11 @@ extern "C" int LLVMFuzzerTestOneInput(const std::uint8_t* data, std::size_t size
     std::wstring black(folder.begin(), folder.end());
     std::wstring small = black + L"/small.png";
     black += L"/black.png";
+    const PictureReader reader(QString::fromStdString(path));
+    const QImage picture = reader.read();
+    if (!picture.isNull() && picture.size() != reader.size())
+        std::abort(); // what was checked is not what was decoded
+    reader.read(QSize(240, 135));
     ImageResizer resizer;
     if (resizer.isAvailableImage(source)) {
         resizer.getImageWidth(source);
