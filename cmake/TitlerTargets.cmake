@@ -14,6 +14,9 @@ if(TITLER_SANITIZE)
     target_compile_definitions(titler_options INTERFACE _GLIBCXX_ASSERTIONS)
     target_link_options(titler_options INTERFACE -fsanitize=${TITLER_SANITIZERS})
 endif()
+if(TITLER_FUZZ)
+    target_compile_options(titler_options INTERFACE -fsanitize=fuzzer-no-link)
+endif()
 
 # Most of the time of a compilation goes into reading Qt's and the standard library's headers. They are precompiled once
 # for each set of Qt modules, since a module's macro changes what its headers mean: Core, Core and Gui, all three.

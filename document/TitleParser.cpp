@@ -73,17 +73,6 @@ bool isNonCharacter(std::string_view text, std::size_t index)
     return bytes == "\xEF\xBF\xBE" || bytes == "\xEF\xBF\xBF";
 }
 
-// Bytes of the character that begins at index, 0 when none does.
-std::size_t lengthAt(std::string_view text, std::size_t index)
-{
-    constexpr std::size_t LONGEST = 4;
-    for (std::size_t length = 1; length <= LONGEST && index + length <= text.size(); ++length) {
-        if (Utf8::isValid(text.substr(index, length)))
-            return length;
-    }
-    return 0;
-}
-
 // A keyboard may send any character, and a file without an encoding bytes that are none. What XML cannot hold
 // would make the file unreadable for all other processes; a replacement character keeps the count of
 // characters.
@@ -92,7 +81,7 @@ std::string writable(const std::string& text)
     static constexpr std::string_view REPLACEMENT = "\xEF\xBF\xBD";
     std::string result;
     for (std::size_t i = 0; i < text.size();) {
-        const std::size_t length = lengthAt(text, i);
+        const std::size_t length = Utf8::lengthAt(text, i);
         if (length == 0 || isControl(text, i) || isNonCharacter(text, i))
             result.append(REPLACEMENT);
         else

@@ -531,7 +531,10 @@ void FolderPicker::doRename(const QString& name, const QModelIndex& index)
         mFactory->renameFolder(mOldName, name);
         insertChildrenIndex(index, name);
     } else if (name != mOldName) {
-        ListMessages::post(MessageDef::MESSAGE_DISK_FULL_ON_CREATE, tr("folder"));
+        if (QFileInfo::exists(folderPath(name))) // made by others meanwhile
+            ListMessages::post(MessageDef::MESSAGE_RENAME_FAILED, name);
+        else
+            ListMessages::post(MessageDef::MESSAGE_DISK_FULL_ON_CREATE, tr("folder"));
     }
     setAttributeAtDoEdit(index, now);
     if (ITitlerFolderReporter* reporter = ITitlerFolderReporter::instance())

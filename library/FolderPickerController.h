@@ -27,7 +27,8 @@ public:
     bool createFolder(const QString& root, const QString& name) const;
     // False also when another folder or file has the new name.
     bool renameFolder(const QString& root, const QString& oldName, const QString& newName) const;
-    // Makes the folder and copies what the source, a full path, holds.
+    // Makes the folder and copies what the source, a full path, holds. False when any of it cannot be copied;
+    // the folder is not left half made then.
     bool duplicateFolder(const QString& root, const QString& source, const QString& name) const;
 
     // Whether less would be free than the limit, the limit included, or that cannot be told. withFolderSize:

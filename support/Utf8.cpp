@@ -55,3 +55,23 @@ bool Utf8::isValid(std::string_view bytes)
     }
     return true;
 }
+
+std::size_t Utf8::lengthAt(std::string_view bytes, std::size_t index)
+{
+    const auto* const start = reinterpret_cast<const unsigned char*>(bytes.data());
+    const unsigned char* const p = start + index;
+    return *p < 0x80 ? 1 : static_cast<std::size_t>(sequenceLength(p, start + bytes.size()));
+}
+
+std::string Utf8::repaired(std::string_view bytes)
+{
+    static constexpr std::string_view REPLACEMENT = "\xEF\xBF\xBD";
+    std::string result;
+    result.reserve(bytes.size());
+    for (std::size_t i = 0; i < bytes.size();) {
+        const std::size_t length = lengthAt(bytes, i);
+        result.append(length == 0 ? REPLACEMENT : bytes.substr(i, length));
+        i += length == 0 ? 1 : length;
+    }
+    return result;
+}

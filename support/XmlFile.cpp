@@ -2,6 +2,7 @@
 
 #include "support/AtomicFile.h"
 #include "support/RefusedWrites.h"
+#include "support/Utf8.h"
 #include "support/XmlFileGuard.h"
 
 #include <cstdio>
@@ -191,5 +192,10 @@ std::string XmlFile::toBytes(const TiXmlDocument& document)
 {
     Printer printer;
     printer.print(document);
-    return printer.take();
+    std::string bytes = printer.take();
+    // A reference in a file without an encoding was read as a byte of its own. Such bytes would make the file
+    // unreadable from here on.
+    if (!Utf8::isValid(bytes))
+        bytes = Utf8::repaired(bytes);
+    return bytes;
 }

@@ -18,6 +18,6 @@ public:
     // does. False, with the old file untouched, when the disk refuses.
     static bool save(const TiXmlDocument& document, const std::string& path);
 
-    // The bytes that SaveFile writes.
+    // The bytes that SaveFile writes, those that are not UTF-8 replaced.
     static std::string toBytes(const TiXmlDocument& document);
 };

@@ -2,6 +2,8 @@
 
 #include "support/Utf8.h"
 
+#include <charconv>
+#include <cstdint>
 #include <cstring>
 #include <strings.h>
 
@@ -105,10 +107,18 @@ private:
             const char* const digits = p;
             while (p != end && (isHexadecimal ? isHexadecimalDigit(*p) : *p >= '0' && *p <= '9'))
                 ++p;
-            if (p == digits || p == end || *p != ';')
+            if (p == digits || p == end || *p != ';' || !isCharacter({digits, p}, isHexadecimal ? 16 : 10))
                 return false;
         }
         return true;
+    }
+
+    // What has no UTF-8 would make a file unreadable that it is saved to; a NUL would end a name.
+    static bool isCharacter(std::string_view digits, int base)
+    {
+        std::uint32_t code = 0;
+        const auto [end, error] = std::from_chars(digits.begin(), digits.end(), code, base);
+        return error == std::errc() && code > 0 && code <= 0x10FFFF && (code < 0xD800 || code > 0xDFFF);
     }
 
     static bool isHexadecimalDigit(char c)

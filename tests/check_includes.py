@@ -13,7 +13,7 @@ import sys
 import tempfile
 
 LAYERS = ["support", "messaging", "document", "touchui", "canvas", "panel", "library", "app"]
-UPPER = ["appliance", "gallery", "bench", "tests"]
+UPPER = ["appliance", "gallery", "bench", "fuzz", "tests"]
 MAX_LINES = 800
 SUFFIXES = (".h", ".cpp", ".cc", ".c", ".hpp")
 # Scripts are held to the length only.

@@ -536,19 +536,6 @@ private Q_SLOTS:
         QCOMPARE(f.names(), QStringList());
     }
 
-    void aRenameThatTheDiskRefuses()
-    {
-        f.make("news");
-        f.open();
-        f.make("later"); // without a word
-        f.hold("news");
-        f.enter("later");
-        QVERIFY(!f.picker->editor());
-        QCOMPARE(f.names(), QStringList{"news"});
-        QCOMPARE(f.folders(), QStringList({"later", "news"}));
-        QCOMPARE(f.reports.take(), QStringList({"rename news", "renamed news to news"}));
-    }
-
     void touchesElsewhereEndAnEdit()
     {
         f.make("news");

@@ -97,6 +97,10 @@ private Q_SLOTS:
         row("good references", "<r a=\"&#x4E2D;&#65;&amp;&other;&\">&#x41;&</r>", true);
         row("open reference", "<r a=\"&#x41\"/>", false);
         row("reference without digits", "<r>&#x;</r>", false);
+        row("reference to a surrogate", "<r a=\"&#xD800;\"/>", false);
+        row("reference beyond Unicode", "<r>&#1114112;</r>", false);
+        row("reference to the last character", "<r>&#x10FFFD;&#55295;</r>", true);
+        row("reference to NUL", "<r a=\"&#x00;\"/>", false);
         row("byte order mark", "\xEF\xBB\xBF<r/>", true);
         row("cut sequence", "<r a=\"\xE4\xB8\"/>", false);
         row("overlong", "<r a=\"\xC0\x80\"/>", false);
@@ -245,6 +249,19 @@ private Q_SLOTS:
         QVERIFY(expected.SaveFile(expectedPath.toLocal8Bit().constData()));
         QVERIFY(XmlFile::save(document, path));
         QCOMPARE(read(QString::fromStdString(path)), read(expectedPath));
+    }
+
+    // Without an encoding a reference is one byte, whatever it stands for.
+    void whatWasReadIsReadableWhenSaved()
+    {
+        const std::string path = write("<r a=\"&#xA0;&#xE4;\">&#xFF;<b/></r>").toStdString();
+        TiXmlDocument document;
+        QVERIFY(XmlFile::load(path, document));
+        QVERIFY(XmlFile::save(document, path));
+        QVERIFY(XmlFileGuard::accepts(read(QString::fromStdString(path)).toStdString()));
+        TiXmlDocument again;
+        QVERIFY(XmlFile::load(path, again));
+        QCOMPARE(QByteArray(again.RootElement()->Attribute("a")), QByteArray("\xEF\xBF\xBD\xEF\xBF\xBD"));
     }
 
     void refusesWhatIsNoPlainFile()

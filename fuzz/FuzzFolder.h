@@ -1,0 +1,79 @@
+// The data path of a fuzz target: a folder in memory that goes with the process, and the environment that
+// names it.
+#pragma once
+
+#include <cstdint>
+#include <cstdlib>
+#include <filesystem>
+#include <fstream>
+#include <string>
+#include <string_view>
+#include <sys/stat.h>
+#include <unistd.h>
+
+class FuzzFolder
+{
+public:
+    // The one of this process.
+    static FuzzFolder& instance()
+    {
+        static FuzzFolder folder;
+        return folder;
+    }
+
+    // The folder that the paths of the path file are relative to, without a final slash.
+    std::string base() const { return mRoot + "/defaultuser"; }
+
+    static void write(const std::string& path, std::string_view bytes)
+    {
+        std::ofstream file(path, std::ios::binary | std::ios::trunc);
+        file.write(bytes.data(), static_cast<std::streamsize>(bytes.size()));
+    }
+
+    static std::string_view view(const std::uint8_t* data, std::size_t size)
+    {
+        return {reinterpret_cast<const char*>(data), size};
+    }
+
+    static std::string read(const std::string& path)
+    {
+        std::ifstream file(path, std::ios::binary);
+        return {std::istreambuf_iterator<char>(file), {}};
+    }
+
+    // Removes all that lies in the folder.
+    static void empty(const std::string& folder)
+    {
+        std::error_code error;
+        std::filesystem::remove_all(folder, error);
+        std::filesystem::create_directories(folder, error);
+    }
+
+private:
+    FuzzFolder()
+    {
+        const char* const memory = "/dev/shm";
+        std::string pattern =
+            std::string(::access(memory, W_OK) == 0 ? memory : "/tmp") + "/titler-fuzz-XXXXXX";
+        if (!::mkdtemp(pattern.data()))
+            std::abort();
+        mRoot = pattern;
+        ::setenv("K2SYS_AC_ROOT", "", 1);
+        ::setenv("K2SYS_AC_DATA", mRoot.c_str(), 1);
+        ::setenv("K2SYS_LOG_DIR", mRoot.c_str(), 1);
+        for (const char* folder : {"/titles", "/settings", "/usertemplates", "/templates/templates_en",
+                                   "/templates/templates_chs", "/resources/Templates"})
+            std::filesystem::create_directories(base() + folder);
+        write(base() + "/PathInfo.xml",
+              "<?xml version=\"1.0\"?><PathInfo><TitleResource path=\"titles\"/>"
+              "<SystemSetting path=\"settings\"/><TitlerTemplate path=\"usertemplates\"/>"
+              "<Template path=\"templates\"/><Font path=\"fonts\"/></PathInfo>");
+    }
+    ~FuzzFolder()
+    {
+        std::error_code error;
+        std::filesystem::remove_all(mRoot, error);
+    }
+
+    std::string mRoot;
+};
