@@ -3,6 +3,7 @@
 #include "touchui/CustomComboBoxView.h"
 
 #include <QPainter>
+#include <QtMath>
 
 #include <algorithm>
 
@@ -58,6 +59,6 @@ void FontFamilyDelegate::paint(QPainter* painter, const QStyleOptionViewItem& op
 QSize FontFamilyDelegate::sizeHint(const QStyleOptionViewItem& option, const QModelIndex& index) const
 {
     const QString family = index.data(Qt::DisplayRole).toString();
-    const QFontMetrics metrics(rowFont(option, family));
-    return QSize(metrics.horizontalAdvance(changeFamilyName(family)) + 2 * TEXT_MARGIN, ROW_HEIGHT);
+    const QFontMetricsF metrics(rowFont(option, family));
+    return QSize(qCeil(metrics.horizontalAdvance(changeFamilyName(family))) + 2 * TEXT_MARGIN, ROW_HEIGHT);
 }

@@ -5,6 +5,7 @@
 #include <QBrush>
 #include <QIcon>
 #include <QPainter>
+#include <QtMath>
 
 namespace
 {
@@ -91,6 +92,7 @@ void CustomComboBoxDelegate::paint(QPainter* painter, const QStyleOptionViewItem
 
 QSize CustomComboBoxDelegate::sizeHint(const QStyleOptionViewItem& option, const QModelIndex& index) const
 {
-    const int width = option.fontMetrics.horizontalAdvance(index.data(Qt::DisplayRole).toString());
+    const QString text = index.data(Qt::DisplayRole).toString();
+    const int width = qCeil(QFontMetricsF(option.font).horizontalAdvance(text));
     return QSize(width + 2 * TEXT_MARGIN, qMax(ROW_HEIGHT, option.fontMetrics.height() + 8));
 }

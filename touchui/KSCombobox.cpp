@@ -8,6 +8,8 @@
 #include "touchui/SliceFrame.h"
 
 #include <QCoreApplication>
+#include <QFontMetricsF>
+#include <QFrame>
 #include <QKeyEvent>
 #include <QLayout>
 #include <QLineEdit>
@@ -17,6 +19,7 @@
 #include <QStandardItemModel>
 #include <QStyleOptionComboBox>
 #include <QTouchEvent>
+#include <QtMath>
 
 #include <algorithm>
 
@@ -45,11 +48,19 @@ public:
         case SH_Menu_FlashTriggeredItem:
         case SH_Menu_FadeOutOnHide:
             return 0;
+        case SH_ComboBox_PopupFrameStyle: // the list paints its own
+            return QFrame::NoFrame;
         default:
             return QProxyStyle::styleHint(hint, option, widget, returnData);
         }
     }
 };
+
+SliceFrame listFrame()
+{
+    static const QStringList paths = SliceFrame::family(QStringLiteral(":/Dialog/Dialog_base_"));
+    return SliceFrame(paths);
+}
 
 } // namespace
 
@@ -217,7 +228,7 @@ int KSCombobox::longestTextWidth() const
 {
     int longest = 0;
     for (int row = 0; row < count(); ++row) {
-        longest = qMax(longest, fontMetrics().horizontalAdvance(itemText(row)));
+        longest = qMax(longest, qCeil(QFontMetricsF(font()).horizontalAdvance(itemText(row))));
     }
     return longest;
 }
@@ -301,6 +312,9 @@ bool KSCombobox::handlePopupWidgetEvent(QObject*, QEvent* event)
     case QEvent::Paint:
         drawPopListTranslucent(m_popup);
         return true;
+    case QEvent::Show: // the base takes it away with every change of size
+        m_popup->setMask(listFrame().mask(m_popup->size()));
+        return false;
     case QEvent::Hide:
         popupHidden();
         return false;
@@ -316,12 +330,11 @@ bool KSCombobox::handlePopupWidgetEvent(QObject*, QEvent* event)
 
 void KSCombobox::drawPopListTranslucent(QWidget* popup)
 {
-    static const QStringList paths = SliceFrame::family(QStringLiteral(":/Dialog/Dialog_base_"));
     QPainter painter(popup);
     painter.setCompositionMode(QPainter::CompositionMode_Source);
     painter.fillRect(popup->rect(), Qt::transparent);
     painter.setCompositionMode(QPainter::CompositionMode_SourceOver);
-    SliceFrame(paths).paint(painter, popup->rect());
+    listFrame().paint(painter, popup->rect());
 }
 
 bool KSCombobox::event(QEvent* event)

@@ -241,7 +241,7 @@ bool KSScrollViewerWidget::giveBackWidgetItem(KSBaseItemWidget* item)
 {
     const int index = m_board->indexOf(item);
     const bool isShown = index >= m_firstVisible && index <= m_lastVisible;
-    if (!m_board->row(index) || isShown || m_press.item == item || m_press.object == item)
+    if (!m_board->row(index) || isShown || m_press.item == item || m_finger.receiver() == item)
         return false;
     disconnectItem(item);
     m_board->giveBack(item);

@@ -14,6 +14,7 @@
 #include <QSignalSpy>
 #include <QStandardItemModel>
 #include <QTest>
+#include <QtMath>
 
 class TestKSCombobox : public QObject
 {
@@ -34,6 +35,9 @@ private Q_SLOTS:
     void cancelAndSecondFinger();
     void width_data();
     void width();
+    void longestRowIsWhole_data();
+    void longestRowIsWhole();
+    void cornersAreNotPartOfTheList();
     void placedUnderOrOverTheBox();
     void listFollowsTheFingerAndRunsOn();
     void flickIntoTheEndStops();
@@ -276,6 +280,46 @@ void TestKSCombobox::width()
     QTEST(KSCombobox::listWidth(box, 200, byText, bar), "expected");
 }
 
+void TestKSCombobox::longestRowIsWhole_data()
+{
+    QTest::addColumn<QString>("row");
+    // Widths in fractions of a pixel, some to be rounded up and some down.
+    for (const char* row :
+         {"A longer row than the box", "A longer row than the bo", "A longer row than the b",
+          "A longer row than the", "Nimbus Roman No9 L and more", "iiiiiiiiiiiiiiiiiiiiiiiiiiiiiiiiii"})
+        QTest::newRow(row) << QString::fromLatin1(row);
+}
+
+void TestKSCombobox::longestRowIsWhole()
+{
+    QFETCH(QString, row);
+    m_box->setListWidthByText(true);
+    m_box->setItemText(1, row);
+    open();
+    const QFontMetrics metrics(m_box->font());
+    const int room = list()->width() - 2 * CustomComboBoxDelegate::TEXT_MARGIN;
+    QVERIFY2(metrics.elidedText(row, Qt::ElideRight, room) == row,
+             qPrintable(QStringLiteral("%1 in %2, list %3")
+                            .arg(QFontMetricsF(m_box->font()).horizontalAdvance(row))
+                            .arg(room)
+                            .arg(m_box->listView()->window()->width())));
+}
+
+// Without a compositor they would be black.
+void TestKSCombobox::cornersAreNotPartOfTheList()
+{
+    for (const int rows : {5, 3}) {
+        fill(rows);
+        open();
+        const QWidget* window = m_box->listView()->window();
+        QVERIFY(!window->mask().contains(QPoint(0, 0)));
+        QVERIFY(!window->mask().contains(QPoint(window->width() - 1, window->height() - 1)));
+        QVERIFY(window->mask().contains(window->rect().center()));
+        QCOMPARE(window->mask().boundingRect(), window->rect());
+        m_box->hidePopup();
+    }
+}
+
 void TestKSCombobox::placedUnderOrOverTheBox()
 {
     const QPoint corner = m_box->mapToGlobal(QPoint(0, 0));
@@ -298,7 +342,7 @@ void TestKSCombobox::placedUnderOrOverTheBox()
     m_box->addItem(QStringLiteral("A row that is a good deal longer than the box is wide"));
     open();
     QCOMPARE(m_box->listView()->window()->width(),
-             m_box->fontMetrics().horizontalAdvance(m_box->itemText(5)) + 44);
+             qCeil(QFontMetricsF(m_box->font()).horizontalAdvance(m_box->itemText(5))) + 44);
 }
 
 void TestKSCombobox::listFollowsTheFingerAndRunsOn()
