@@ -57,10 +57,12 @@ private:
     Reports waitForMessage()
     {
         Reports posted;
-        QTest::qWaitFor([&] {
+        const auto isPosted = [&] {
             posted += mMessages.take();
             return !posted.isEmpty();
-        });
+        };
+        if (!QTest::qWaitFor(isPosted))
+            qWarning("no message");
         return posted;
     }
     static void verifyTitles(const QString& folder, const Names& stems)
