@@ -29,6 +29,12 @@ ArchiveCheckThread::~ArchiveCheckThread()
     wait();
 }
 
+void ArchiveCheckThread::begin()
+{
+    if (!std::exchange(mHasBegun, true))
+        start(QThread::InheritPriority);
+}
+
 QSet<std::size_t> ArchiveCheckThread::takeUnreadable()
 {
     QMutexLocker lock(&mMutex);

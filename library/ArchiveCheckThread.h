@@ -22,6 +22,8 @@ public:
     // Waits for the title that is being read, not for the others.
     ~ArchiveCheckThread() override;
 
+    // Starts the thread, unless it has been started. GUI thread.
+    void begin();
     // Returns the rows found since the last call. Any thread.
     QSet<std::size_t> takeUnreadable();
 
@@ -37,6 +39,7 @@ private:
 
     std::shared_ptr<const FolderTitles> mTitles;
     std::size_t mFirst;
+    bool mHasBegun = false;
     std::atomic<bool> mCancelled{false};
     QMutex mMutex; // guards mUnreadable
     QSet<std::size_t> mUnreadable;

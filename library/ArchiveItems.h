@@ -34,6 +34,8 @@ public:
     QList<ArchiveItem*> beginToComplete();
     // Gives the item its child widgets. An item that is gone or complete is left alone.
     void complete(ArchiveItem* item);
+    // Whether all items that were begun with are complete.
+    bool isComplete() const { return mIncomplete.isEmpty(); }
 
     // Ends the item and returns its record; null when that was not owned here.
     std::unique_ptr<Archive> take(ArchiveItem* item);

@@ -219,13 +219,13 @@ void ArchiveList::readFolder()
     mCheck = std::make_unique<ArchiveCheckThread>(titles, next);
     connect(mCheck.get(), &ArchiveCheckThread::unreadableFound, this, &ArchiveList::removeUnreadable,
             Qt::QueuedConnection);
-    mCheck->start(QThread::InheritPriority);
 }
 
 void ArchiveList::finishCheck()
 {
     if (!mCheck)
         return;
+    mCheck->begin();
     mCheck->wait();
     removeUnreadable();
     mCheck.reset();
@@ -331,11 +331,20 @@ void ArchiveList::slotAddArchiveData()
     mContentsRequested = false;
     for (ArchiveItem* item : mItems.beginToComplete())
         Q_EMIT signalAddOneArchiveData(item);
+    beginCheck();
 }
 
 void ArchiveList::slotAddOneArchiveData(ArchiveItem* item)
 {
     mItems.complete(item);
+    beginCheck();
+}
+
+// The first screen comes before the titles that nobody looks at.
+void ArchiveList::beginCheck()
+{
+    if (mCheck && mItems.isComplete())
+        mCheck->begin();
 }
 
 // Called after a long folder has been scrolled. What is far from view goes first.

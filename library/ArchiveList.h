@@ -168,6 +168,7 @@ private:
     void clearOldArchiveList();
     // Whatever changes the list needs the final places of the titles: waits for a check that still runs.
     void finishCheck();
+    void beginCheck();
     void removeUnreadable();
     void readFolder();
     void requestContents();

@@ -110,7 +110,7 @@ bool FolderPicker::checkCanShowTemplate(const QModelIndex& index) const
     if (!index.isValid())
         return true;
     const QModelIndex folder = folderOf(index);
-    if ((mModel->rowCount(folder) == 0 || isCreateNew()) &&
+    if ((!mModel->hasChildren(folder) || isCreateNew()) &&
         checkDiskSpaceIsFull(folderPath(nameOf(folder)), false)) {
         ListMessages::post(MessageDef::MESSAGE_DISK_FULL_ON_CREATE, tr("File"));
         return false;

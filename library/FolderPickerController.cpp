@@ -6,12 +6,13 @@
 #include "support/IPathManagerEx.h"
 #include "support/SystemInfo.h"
 
+#include <QDirIterator>
+
 bool FolderPickerController::isNullDirectory(const QFileInfo& folder) const
 {
-    return !folder.isDir() ||
-           QDir(folder.filePath())
-               .entryList(QDir::AllEntries | QDir::Hidden | QDir::System | QDir::NoDotAndDotDot)
-               .isEmpty();
+    return !folder.isDir() || !QDirIterator(folder.filePath(), QDir::AllEntries | QDir::Hidden |
+                                                                   QDir::System | QDir::NoDotAndDotDot)
+                                   .hasNext();
 }
 
 bool FolderPickerController::isTitleFolder(const QString& root, const QString& name) const

@@ -18,6 +18,8 @@ const QString FolderPickerFactory::FOLDER_ICON = QStringLiteral(":/FolderPicker/
 namespace
 {
 
+const QLatin1String TITLE_EXTENSION(".xml");
+
 // A node is a folder's number and, counted from 1, a title's place in it.
 constexpr int TITLE_BITS = 16;
 constexpr quintptr TITLE_MASK = (quintptr(1) << TITLE_BITS) - 1;
@@ -66,6 +68,7 @@ void FolderPickerFactory::importSourceData()
     mFolders.clear();
     mTitleInfos.clear();
     mTitleNames.clear();
+    mHasTitles.clear();
     if (mRootPath.isEmpty())
         return;
     const QStringList names =
@@ -84,8 +87,7 @@ void* FolderPickerFactory::takeFolder(const QString& name)
         mNumbers.insert(name, number);
         mFolderNames.insert(number, name);
     }
-    mTitleInfos.remove(number);
-    mTitleNames.remove(number);
+    forgetTitles(number);
     return nodeOf(number);
 }
 
@@ -99,8 +101,7 @@ void FolderPickerFactory::renameFolder(const QString& oldName, const QString& ne
         mFolderNames[gone] = QString();
     mNumbers.insert(newName, number);
     mFolderNames[number] = newName;
-    mTitleInfos.remove(number);
-    mTitleNames.remove(number);
+    forgetTitles(number);
 }
 
 void FolderPickerFactory::getChildInfo(const QString& path, int folder)
@@ -115,20 +116,47 @@ void FolderPickerFactory::getChildInfo(const QString& path, int folder)
 
 QList<QFileInfo> FolderPickerFactory::getTitlerFiles(int, const QString& path)
 {
+    return firstTitlerFiles(path, static_cast<qsizetype>(TITLE_MASK) - 1);
+}
+
+QList<QFileInfo> FolderPickerFactory::firstTitlerFiles(const QString& path, qsizetype most) const
+{
     QList<QFileInfo> titles;
     if (mDisk.isNullDirectory(QFileInfo(path)))
         return titles;
     for (const ArchiveOrder& row : FolderOrder::rowsToShow(path.toStdString())) {
         const QString name = QString::fromStdString(row.getArchivePath());
-        if (!FolderNameRules::isFolderName(name) || !QDir::match(QStringLiteral("*.xml"), name))
+        if (!FolderNameRules::isFolderName(name) || !name.endsWith(TITLE_EXTENSION, Qt::CaseInsensitive))
             continue;
         const QFileInfo info(path + QLatin1Char('/') + name);
         if (info.isFile() && !ConfinedPath::namedByOrder(path.toStdString(), name.toStdString()).empty())
             titles.append(info);
-        if (titles.size() >= static_cast<qsizetype>(TITLE_MASK) - 1)
+        if (titles.size() >= most)
             break;
     }
     return titles;
+}
+
+void FolderPickerFactory::forgetTitles(int folder)
+{
+    mTitleInfos.remove(folder);
+    mTitleNames.remove(folder);
+    mHasTitles.remove(folder);
+}
+
+// A view asks it of every row that it paints.
+bool FolderPickerFactory::hasTitles(int folder)
+{
+    if (mTitleInfos.contains(folder))
+        return !mTitleInfos.value(folder).isEmpty();
+    const QString name = mFolderNames.value(folder);
+    if (name.isEmpty())
+        return false;
+    auto known = mHasTitles.constFind(folder);
+    if (known == mHasTitles.constEnd())
+        known =
+            mHasTitles.insert(folder, !firstTitlerFiles(mRootPath + QLatin1Char('/') + name, 1).isEmpty());
+    return *known;
 }
 
 void FolderPickerFactory::ensureChildInfo(int folder)
@@ -148,6 +176,11 @@ void* FolderPickerFactory::getNextNode(void* node)
     }
     const qsizetype place = mFolders.indexOf(folder);
     return place >= 0 && place + 1 < mFolders.size() ? nodeOf(mFolders.at(place + 1)) : nullptr;
+}
+
+bool FolderPickerFactory::hasChildNode(void* node)
+{
+    return node == nullptr ? !mFolders.isEmpty() : titleOf(node) < 0 && hasTitles(folderOf(node));
 }
 
 void* FolderPickerFactory::getChildNode(void* node)

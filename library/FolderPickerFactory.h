@@ -44,6 +44,8 @@ public:
     void importSourceData() override;
     void* getNextNode(void* node) override;
     void* getChildNode(void* node) override;
+    // Reads no more titles than it takes to know.
+    bool hasChildNode(void* node) override;
     void InstallItemAttribute(KSModelAttributeItem* item, void* node) override;
 
     // Of a folder under the root, whether it is there or not.
@@ -69,6 +71,10 @@ public Q_SLOTS:
 private:
     void getChildInfo(const QString& path, int folder);
     void ensureChildInfo(int folder);
+    // Whether the folder has titles, for which only some of them may have to be looked at.
+    bool hasTitles(int folder);
+    void forgetTitles(int folder);
+    QList<QFileInfo> firstTitlerFiles(const QString& path, qsizetype most) const;
     void setAttributes(KSModelAttributeItem* item, const QString& name, const QDateTime& date,
                        bool folder) const;
     void setDisplayAttribute(KSModelAttributeItem* item, const QString& name, const QString& date) const;
@@ -87,5 +93,6 @@ private:
     QMap<int, QString> mFolderNames;         // the other way round
     QMap<int, QList<QFileInfo>> mTitleInfos; // of the folders whose titles have been read
     QMap<int, QStringList> mTitleNames;
+    QMap<int, bool> mHasTitles; // of the folders that were asked about
     QPointer<FolderEditor> mEditor;
 };

@@ -146,14 +146,6 @@ void logTypedText(QString text)
     }
 }
 
-// X11 gives the keyboard to windows, and windows of the keyboard service may have taken it.
-void giveInputFocus(unsigned long window)
-{
-    if (QGuiApplication::platformName() == QLatin1String("xcb")) {
-        KSInputFocusManager::setInputFocusWindow(window);
-    }
-}
-
 } // namespace
 
 void KSInputContext::install()
@@ -289,7 +281,7 @@ bool KSInputContext::filterSpecialKeyEvent(const QEvent* event) const
 bool KSInputContext::filterRequestSoftwareInputPanel()
 {
     if (getFocusWidget() == nullptr) {
-        giveInputFocus(m_windowId);
+        KSInputFocusManager::giveFocus(m_windowId);
         return false;
     }
     commit(); // keys go to the service from now on; what was being composed must not be lost
@@ -329,9 +321,7 @@ void KSInputContext::setFocusWidget(QWidget* widget)
     if (!m_bClosed && !serviceOwnsState()) {
         return;
     }
-    if (widget != nullptr && widget->window()->isVisible() && widget->window()->internalWinId() != 0) {
-        giveInputFocus(widget->window()->internalWinId());
-    }
+    KSInputFocusManager::giveFocus(widget);
     if (m_baseFocusWidget != widget) {
         if (m_baseFocusWidget != nullptr) {
             m_baseFocusWidget->removeEventFilter(this);

@@ -1,5 +1,8 @@
 #include "touchui/KSInputFocusManager.h"
 
+#include <QApplication>
+#include <QWidget>
+
 #include <X11/Xlib.h>
 
 namespace
@@ -62,5 +65,25 @@ void KSInputFocusManager::setInputFocusWindow(unsigned long window)
     if (focusWindow(connection.get()) != window) {
         XSetInputFocus(connection.get(), window, RevertToPointerRoot, CurrentTime);
         XFlush(connection.get());
+    }
+}
+
+void KSInputFocusManager::giveFocus(unsigned long window)
+{
+    if (QGuiApplication::platformName() == QLatin1String("xcb")) {
+        setInputFocusWindow(window);
+    }
+}
+
+// A window may hear that it was activated when a dialog has opened before it already. It leaves the keyboard
+// to the dialog: each would take it from the other without end.
+void KSInputFocusManager::giveFocus(const QWidget* widget)
+{
+    if (widget == nullptr || !widget->window()->isVisible() || widget->window()->internalWinId() == 0) {
+        return;
+    }
+    const QWidget* dialog = QApplication::activeModalWidget();
+    if (dialog == nullptr || dialog == widget->window()) {
+        giveFocus(static_cast<unsigned long>(widget->window()->internalWinId()));
     }
 }

@@ -33,13 +33,16 @@ public:
     virtual void importSourceData() = 0;
     // The node behind this one under the same parent; null behind the last.
     virtual void* getNextNode(void* node) = 0;
-    // The first node under this one; null when there is none. Cheap: it is asked for every row on the screen.
+    // The first node under this one; null when there is none.
     virtual void* getChildNode(void* node) = 0;
     virtual void InstallItemAttribute(KSModelAttributeItem* item, void* node) = 0;
 
     // NoDataType for a column that was not set.
     virtual KSDataType getColumnDataType(int column) const;
     virtual void setColumnDataType(int column, KSDataType type);
+
+    // Whether there are nodes under this one. Asked for every row on the screen, so it should be cheap.
+    virtual bool hasChildNode(void* node) { return getChildNode(node) != nullptr; }
 
 private:
     QMap<int, KSDataType> m_columnDataTypes;

@@ -296,7 +296,7 @@ bool KSTreeModel::hasChildren(const QModelIndex& parent) const
     }
     void* source = item->dataItem()->getSourceData();
     return m_factory != nullptr && (source != nullptr || item == m_root.get()) &&
-           m_factory->getChildNode(source) != nullptr;
+           m_factory->hasChildNode(source);
 }
 
 QVariant KSTreeModel::data(const QModelIndex& index, int role) const

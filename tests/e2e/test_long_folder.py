@@ -15,6 +15,7 @@ MANY = 1000
 FIRST_SCREEN = (0.5, 4)  # seconds
 OPEN = (5, 25)
 CLOSE = (2, 8)
+PICKER = (1, 10)
 MEMORY = 300  # MB
 GROWTH = 20
 # Points of the window: the pictures of the list's first and seventh row, and places along the scroll bar.
@@ -103,6 +104,29 @@ class LongFolder(harness.TitlerTest):
     def has_selected(self, number):
         with open(os.path.join(self.keep, "k2_ope.log"), encoding="utf-8") as stream:
             return f"Select  the {number} Thumbnail" in stream.read()
+
+    def test_the_folder_picker_of_a_later_session(self):
+        """The picker opens over the window while that still hears of having been shown."""
+        longfolder.make(self.folder("Long"), TITLES)
+        self.command(f'edit "{self.folder()}"')
+        self.wait_shown()
+        self.close_and_measure()
+        self.wait_at_rest()
+        began = time.monotonic()
+        self.appliance.command("sub")
+        harness.session.wait_until(self.is_picker, 120 * harness.SLOW, "the picker")
+        self.report("folder picker", time.monotonic() - began, *PICKER, "s")
+        self.report("at rest", self.wait_at_rest() - began, *PICKER, "s")
+        self.choose_folder("Long")
+        harness.session.wait_until(self.is_first_screen, 120 * harness.SLOW, "the first screen of titles")
+        self.wait_at_rest()
+        self.report("memory", self.memory(), MEMORY, MEMORY, "MB")
+        self.close_window()
+        self.assertEqual(self.beyond, [])
+
+    def is_picker(self):
+        self.titler.check()
+        return self.window() and min(self.pixel(*harness.PICKER_LIT)) > harness.LIT
 
     def test_memory_of_a_thousand_titles_is_given_back(self):
         folder = self.folder("Long")

@@ -4,6 +4,7 @@
 
 #include <QLabel>
 #include <QSignalSpy>
+#include <unistd.h>
 
 using Names = QStringList;
 using List = TitleListFixture;
@@ -65,19 +66,38 @@ private:
     QString makeFolder()
     {
         const QString folder = mFixture.titleRoot() + QStringLiteral("/long%1").arg(++mFolderNumber);
-        if (mPattern.isEmpty()) {
-            mPattern = mFixture.makeFolder(QStringLiteral("pattern"));
-            LibraryFixture::fillFolder(mPattern, stems());
-        }
+        if (mPattern.isEmpty())
+            makePattern();
         QDir().mkpath(folder);
-        for (const QString& name : QDir(mPattern).entryList(QDir::Files | QDir::Hidden))
-            QFile::copy(mPattern + '/' + name, folder + '/' + name);
+        // Links are quick to make, and all who write replace the file.
+        for (const QString& name : QDir(mPattern).entryList(QDir::Files))
+            ::link(qPrintable(mPattern + '/' + name), qPrintable(folder + '/' + name));
+        QFile::copy(mPattern + "/.order.xml", folder + "/.order.xml");
         return folder;
+    }
+    // All titles are the first one with another name.
+    void makePattern()
+    {
+        mPattern = mFixture.makeFolder(QStringLiteral("pattern"));
+        LibraryFixture::fillFolder(mPattern, {stem(0)});
+        QFile first(mPattern + '/' + stem(0) + ".xml");
+        QVERIFY(first.open(QIODevice::ReadOnly));
+        const QByteArray bytes = first.readAll();
+        const QByteArray name = stem(0).toUtf8();
+        for (int number = 1; number < TITLES; ++number) {
+            QFile file(mPattern + '/' + stem(number) + ".xml");
+            QVERIFY(file.open(QIODevice::WriteOnly));
+            file.write(QByteArray(bytes).replace(name, stem(number).toUtf8()));
+            ::link(qPrintable(mPattern + '/' + stem(0) + "_240.png"),
+                   qPrintable(mPattern + '/' + stem(number) + "_240.png"));
+        }
+        LibraryFixture::writeOrder(mPattern, stems());
     }
     static void spoil(const QString& folder, int number)
     {
         QFile file(folder + '/' + stem(number) + ".xml");
-        QVERIFY(file.open(QIODevice::WriteOnly | QIODevice::Truncate));
+        QVERIFY(file.remove());
+        QVERIFY(file.open(QIODevice::WriteOnly));
         file.write("<manifest><meta-bg");
     }
     // Waits for nothing.

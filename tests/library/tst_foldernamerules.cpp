@@ -386,6 +386,33 @@ private Q_SLOTS:
         QCOMPARE(torn.names(torn.row("news")), QStringList({"t1", "t2"}));
     }
 
+    void whetherAFolderHasTitles()
+    {
+        LibraryFixture::fillFolder(mFixture.makeFolder("gaps"), {"t1", "t2", "t3"});
+        LibraryFixture::fillFolder(mFixture.makeFolder("none"), {"t1"});
+        for (const char* title : {"gaps/t1.xml", "gaps/t2.xml", "none/t1.xml"})
+            QVERIFY(QFile::remove(path(title)));
+        FolderPickerFactory factory;
+        factory.setRootPath(root());
+        QVERIFY(!factory.hasChildNode(nullptr));
+        factory.importSourceData();
+        QVERIFY(factory.hasChildNode(nullptr));
+        void* gaps = factory.getChildNode(nullptr);
+        void* none = factory.getNextNode(gaps);
+        QVERIFY(factory.hasChildNode(gaps));
+        QVERIFY(!factory.hasChildNode(none));
+        QVERIFY(!factory.hasChildNode(factory.getChildNode(gaps)));
+        QCOMPARE(factory.getNodeInfo(factory.getChildNode(gaps)).fileName(), QStringLiteral("t3.xml"));
+        // What was found holds until the folder is read anew.
+        LibraryFixture::fillFolder(path("none"), {"t1"});
+        QVERIFY(!factory.hasChildNode(none));
+        factory.takeFolder("none");
+        QVERIFY(factory.hasChildNode(none));
+        QVERIFY(QFile::remove(path("none/t1.xml")));
+        factory.importSourceData();
+        QVERIFY(!factory.hasChildNode(none));
+    }
+
     void handlesOutliveRenamesAndReadings()
     {
         LibraryFixture::fillFolder(mFixture.makeFolder("a"), {"t1"});

@@ -6,6 +6,7 @@
 
 #include <QApplication>
 #include <QDeadlineTimer>
+#include <QDialog>
 #include <QFile>
 #include <QLineEdit>
 #include <QProcess>
@@ -99,6 +100,7 @@ private Q_SLOTS:
     void eachKeyIsForwardedOnce();
     void keysWorkAgainWithoutTheService();
     void requestWithoutAFieldGivesBackTheFocus();
+    void windowBehindADialogLeavesTheFocus();
     void deadWindowDoesNoHarm();
 
 private:
@@ -209,6 +211,26 @@ void TestInputContextX11::requestWithoutAFieldGivesBackTheFocus()
     QTRY_VERIFY(m_window->isActiveWindow());
     context->setFocusWidget(m_second.get());
     QTRY_COMPARE(KSInputFocusManager::getInputFocusWindow(), static_cast<unsigned long>(m_second->winId()));
+}
+
+// A window that hears late of its activation would take the keyboard from the dialog, the dialog from the
+// window, and so on.
+void TestInputContextX11::windowBehindADialogLeavesTheFocus()
+{
+    QDialog dialog(m_window.get());
+    dialog.setWindowModality(Qt::WindowModal);
+    dialog.resize(100, 100);
+    dialog.show();
+    QVERIFY(QTest::qWaitForWindowActive(&dialog));
+    KSInputContext* context = KSInputContext::instance();
+    const auto focus = [] { return KSInputFocusManager::getInputFocusWindow(); };
+    QTRY_COMPARE(focus(), static_cast<unsigned long>(dialog.winId()));
+    context->setFocusWidget(m_edit);
+    QCOMPARE(focus(), static_cast<unsigned long>(dialog.winId()));
+    dialog.hide();
+    QTRY_VERIFY(focus() != static_cast<unsigned long>(dialog.winId()));
+    context->setFocusWidget(m_edit);
+    QTRY_COMPARE(focus(), static_cast<unsigned long>(m_window->winId()));
 }
 
 void TestInputContextX11::deadWindowDoesNoHarm()
