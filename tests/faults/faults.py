@@ -28,7 +28,7 @@ FIRST_FOLDER = "news"
 DELETED = "c"
 RENAMING = "duplicate and rename folders"
 OLD_NAME, NEW_NAME = "sport", "sports"
-PATIENCE = 120
+PATIENCE = 60
 
 
 class Run:
