@@ -185,6 +185,7 @@ private:
     void takeBackPreviews(const GraphicsText* except = nullptr);
     void pushDeleteCommand(GraphicsText* item);
     bool saveArchiveXML(const QString& path);
+    // Whether a picture of the title is missing or older than its file.
     bool lacksPictures() const;
     void openKeyboardForItem(GraphicsText* item);
 

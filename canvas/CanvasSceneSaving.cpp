@@ -117,15 +117,17 @@ bool CanvasScene::waitForPictures() const
     return isEditFinish();
 }
 
-// A picture may be missing after a disk was full, or when a copy was cut off.
+// A picture may be missing after a disk was full, or when a copy was cut off; one that is older than the
+// title shows what it said before the process was killed.
 bool CanvasScene::lacksPictures() const
 {
     const QFileInfo title(QString::fromStdString(m_archive->getPath()));
     const std::string names[] = {m_archive->getThumbnailBig(), m_archive->getThumbnailMiddle(),
                                  m_archive->getThumbnailSmall(), m_archive->getThumbnailBlack()};
     return title.exists() && std::any_of(std::begin(names), std::end(names), [&](const std::string& name) {
+               const QFileInfo picture(title.path() + QLatin1Char('/') + QString::fromStdString(name));
                return ArchiveManager::isPictureName(name) &&
-                      !QFileInfo::exists(title.path() + QLatin1Char('/') + QString::fromStdString(name));
+                      (!picture.exists() || picture.lastModified() < title.lastModified());
            });
 }
 

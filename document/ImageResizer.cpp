@@ -5,6 +5,7 @@
 #include "support/LocaleText.h"
 #include "support/k2sys/k2sys.h"
 
+#include <QFileInfo>
 #include <QPainter>
 #include <algorithm>
 #include <mutex>
@@ -38,6 +39,21 @@ QImage with32Bits(const QImage& image)
     if (image.isNull() || image.format() == QImage::Format_RGB32 || image.format() == QImage::Format_ARGB32)
         return image;
     return image.convertToFormat(image.hasAlphaChannel() ? QImage::Format_ARGB32 : QImage::Format_RGB32);
+}
+
+// The checker picture. One that is there and cannot be read just now is as it was before: a picture that is
+// not made for it would not be made later either.
+QImage readChecker(const QString& path)
+{
+    static QString lastPath;
+    static QImage last;
+    const QImage checker = PictureReader::read(path);
+    const std::lock_guard lock(gCheckerMutex);
+    if (!checker.isNull()) {
+        lastPath = path;
+        last = checker;
+    }
+    return checker.isNull() && lastPath == path && QFileInfo::exists(path) ? last : checker;
 }
 
 } // namespace
@@ -77,7 +93,7 @@ bool ImageResizer::resizeImageToThumbnail(const QImage& source, const std::wstri
         const std::lock_guard lock(gCheckerMutex);
         checkerPath = QString::fromStdString(checkerFname_in_title);
     }
-    QImage checker = with32Bits(PictureReader::read(checkerPath));
+    QImage checker = with32Bits(readChecker(checkerPath));
     if (!checker.isNull()) {
         QPainter painter(&checker);
         painter.setCompositionMode(QPainter::CompositionMode_SourceOver);

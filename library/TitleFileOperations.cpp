@@ -190,8 +190,10 @@ std::unique_ptr<Archive> TitleFileOperations::createUserTemplate(const QString& 
     const QString folder = root + QLatin1Char('/') + name;
     if (!SystemInfo::createFolders(folder.toStdWString())) {
         LOG_EVENT(L"ArchiveList", __LINE__, L"ERROR create dir.", 4);
-        // The folder of a template that was deleted is taken again.
-        if (!QFileInfo(folder).isDir())
+        // The folder of a template that was deleted is taken again. A template that is there stays, whatever
+        // the caller could read of the order.
+        if (!QFileInfo(folder).isDir() ||
+            QFileInfo::exists(folder + QLatin1Char('/') + TEMPLATE_STEM + XML_EXTENSION))
             return nullptr;
     }
     bool isCopied = true;

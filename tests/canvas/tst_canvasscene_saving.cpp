@@ -1,7 +1,12 @@
 // What the canvas writes to the title's file when objects are blank, or gone.
 #include "CanvasFixture.h"
 
+#include "document/TitleParser.h"
+
+#include <QDateTime>
 #include <QFile>
+#include <QFileInfo>
+#include <QImage>
 #include <QXmlStreamReader>
 
 class tst_canvasscene_saving : public QObject
@@ -19,6 +24,7 @@ private Q_SLOTS:
     void newObjectThatWasUndoneIsSaved();
     void titleThatNeverHadObjectsIsLeftAlone();
     void nextTitleDoesNotEmptyThePreviousOne();
+    void picturesOlderThanTheTitleAreMadeAgain();
 
 private:
     // The texts of all objects in the file, also of those that a reader would skip.
@@ -43,6 +49,31 @@ void tst_canvasscene_saving::cleanup()
 {
     delete messages;
     messages = nullptr;
+}
+
+void tst_canvasscene_saving::picturesOlderThanTheTitleAreMadeAgain()
+{
+    Canvas canvas;
+    const QStringList names{"t_1920.png", "t_960.png", "t_240.png", "t_240S.png"};
+    canvas.title.setThumbnailBig(names.at(0).toStdString());
+    canvas.title.setThumbnailMiddle(names.at(1).toStdString());
+    canvas.title.setThumbnailSmall(names.at(2).toStdString());
+    canvas.title.setThumbnailBlack(names.at(3).toStdString());
+    QVERIFY(TitleParser().writeOneTitle(&canvas.title) == 1);
+    const QDateTime written = QFileInfo(QString::fromStdString(canvas.title.getPath())).lastModified();
+    for (const QString& name : names)
+        QVERIFY(QImage(4, 4, QImage::Format_RGB32).save(canvas.folder.filePath(name)));
+    canvas.open({makeRecord("a")});
+    QCOMPARE(canvas.log.slow, 0);
+    for (const QString& name : names) {
+        QFile picture(canvas.folder.filePath(name));
+        QVERIFY(picture.open(QIODevice::ReadWrite));
+        QVERIFY(picture.setFileTime(written.addSecs(-1), QFile::FileModificationTime));
+        canvas.log.slow = 0;
+        canvas.open({makeRecord("a")});
+        QCOMPARE(canvas.log.slow, 1);
+        QVERIFY(picture.setFileTime(written.addSecs(1), QFile::FileModificationTime));
+    }
 }
 
 QStringList tst_canvasscene_saving::textsInFile(const Canvas& canvas)

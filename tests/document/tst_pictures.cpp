@@ -226,6 +226,11 @@ private Q_SLOTS:
         QVERIFY(mChecker.convertToFormat(QImage::Format_Indexed8).save(checkerPath()));
         QVERIFY(resize(transparent));
         QCOMPARE(read("small.png").convertToFormat(QImage::Format_RGB32), mChecker);
+        // One that cannot be read just now is taken as it was.
+        QFile torn(checkerPath());
+        QVERIFY(torn.resize(20) && QFile::remove(mFolder->filePath("small.png")));
+        QVERIFY(resize(transparent));
+        QCOMPARE(read("small.png").convertToFormat(QImage::Format_RGB32), mChecker);
     }
 
     void availability()

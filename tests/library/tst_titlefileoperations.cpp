@@ -63,6 +63,7 @@ private Q_SLOTS:
     void copyWithoutPicturesMakesTheTitleAlone();
     void noFileIsLeftAside();
     void templateFolderThatCannotBeMadeIsLogged();
+    void templateThatIsThereStays();
 
 private:
     static void writeFile(const QString& path, const QByteArray& bytes)
@@ -245,6 +246,24 @@ void tst_TitleFileOperations::templateFolderThatCannotBeMadeIsLogged()
     SystemLogCatcher log;
     QVERIFY(mFiles.createUserTemplate(good, QStringLiteral("UserTemplate_001"), *source));
     QVERIFY2(!log.text().contains("ERROR"), log.text());
+}
+
+// The name is chosen from an order file, which may have been unreadable.
+void tst_TitleFileOperations::templateThatIsThereStays()
+{
+    const QString folder = mFixture.makeFolder(QStringLiteral("templates"));
+    const auto first = LibraryFixture::makeRecord(folder, QStringLiteral("s"), QStringLiteral("first"));
+    const auto second = LibraryFixture::makeRecord(folder, QStringLiteral("t"), QStringLiteral("second"));
+    const auto made = mFiles.createUserTemplate(folder, QStringLiteral("UserTemplate_001"), *first);
+    QVERIFY(made);
+    const QString path = QString::fromStdString(made->getPath());
+    const QByteArray before = readFile(path);
+    QVERIFY(!before.isEmpty());
+    QVERIFY(!mFiles.createUserTemplate(folder, QStringLiteral("UserTemplate_001"), *second));
+    QCOMPARE(readFile(path), before);
+    // Its folder alone does not keep the name.
+    QVERIFY(QFile::remove(path));
+    QVERIFY(mFiles.createUserTemplate(folder, QStringLiteral("UserTemplate_001"), *second));
 }
 
 QTEST_GUILESS_MAIN(tst_TitleFileOperations)
