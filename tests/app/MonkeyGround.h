@@ -78,6 +78,11 @@ inline QString dataFolder()
     return QFileInfo(memory).isWritable() ? memory : QDir::tempPath();
 }
 
+// Put before a fixture that asks where temporary folders are.
+struct DataInMemory {
+    DataInMemory() { qputenv("TMPDIR", dataFolder().toLocal8Bit()); }
+};
+
 // A line for every save would be all that is to be seen.
 inline void showErrorsOnly()
 {

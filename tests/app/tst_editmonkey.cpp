@@ -1,6 +1,7 @@
 // Many touches anywhere on the canvas and the panel of the real window. TITLER_SEED repeats a run,
 // TITLER_TOUCHES changes its length: a hundred thousand take some minutes.
 #include "../canvas/StyleProperties.h"
+#include "../library/LibraryFixture.h"
 #include "CanvasFingers.h"
 #include "MonkeyGround.h"
 #include "Siblings.h"
@@ -91,7 +92,9 @@ private:
     QString misplaced() const;
     QByteArray replay(const QString& name);
 
-    QTemporaryDir mData{MonkeyGround::dataFolder() + QStringLiteral("/monkey")};
+    MonkeyGround::DataInMemory mInMemory;
+    LibraryFixture mFiles; // titles are edited below their root only
+    QTemporaryDir mData;
     Siblings mSiblings;
     TitlerWindow* mWindow = nullptr;
     QPointingDevice* mDevice = nullptr;
@@ -121,8 +124,7 @@ void tst_editmonkey::cleanupTestCase()
 
 QString tst_editmonkey::writeFolder()
 {
-    const QString folder = mData.filePath(QStringLiteral("monkey"));
-    QDir().mkpath(folder);
+    const QString folder = mFiles.makeFolder(QStringLiteral("monkey"));
     Archive archive;
     archive.setPath((folder + "/title.xml").toStdString());
     archive.setThumbnailBig("title_1920.png");

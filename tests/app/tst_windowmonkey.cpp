@@ -44,11 +44,6 @@ constexpr int TouchesPerLook = 1000; // at what is on disk
 constexpr int LooksPerPicture = 5;   // read the pictures, too
 constexpr int SaveTimeout = 60000;
 
-// Data in memory, before the fixture asks where.
-struct DataInMemory {
-    DataInMemory() { qputenv("TMPDIR", MonkeyGround::dataFolder().toLocal8Bit()); }
-};
-
 const char* const MustHappen[] = {"titles made",
                                   "titles pasted",
                                   "titles deleted",
@@ -130,7 +125,7 @@ private:
         return [this, what](Arguments...) { ++mCounts[QLatin1String(what)]; };
     }
 
-    DataInMemory mInMemory;
+    MonkeyGround::DataInMemory mInMemory;
     TemplateFixture mFiles;
     TitleAccount mAccount{mFiles};
     Siblings mSiblings;

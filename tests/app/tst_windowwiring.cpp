@@ -234,6 +234,7 @@ void tst_WindowWiring::dialogs()
     ROW(mFolders, FolderPicker::signalCancelClicked, mWindow, TitlerWindow::slotCancelClicked);
     ROW(mFolders, FolderPicker::changeFolderPath, mList, ArchiveList::refreshArchiveList);
     ROW(mFolders, FolderPicker::changeFolderFile, mList, ArchiveList::refreshArchiveListInFile);
+    ROW(mFolders, FolderPicker::folderMoved, mScene, CanvasScene::folderRenamed);
     ROW(mFolders, FolderPicker::folderNameChange, mList, ArchiveList::refreshArchiveListForChangeFolderName);
     ROW(mTemplates, TemplatePicker::selectedTemplate, mWindow,
         TitlerWindow::slotStartCreateNewArchiveFromTemplate);

@@ -504,7 +504,7 @@ private Q_SLOTS:
         QCOMPARE(manager->saveLastTemplatePath("/x"), 0);
         QCOMPARE(manager->deleteTemplatePath(userFile("a/Titler.xml").toStdString()), 0);
         Archive archive;
-        QCOMPARE(manager->createNewTemplateXml("imported", &archive), 1); // a refused save is not reported
+        QCOMPARE(manager->createNewTemplateXml("imported", &archive), -1);
         QCOMPARE(manager->addNewTemplateToLastInOrderXml("imported"), 1);
         manager->renameInOrderXml("a", "c");
         QCOMPARE(read(userFile(".order.xml")), order);
