@@ -195,7 +195,7 @@ void tst_TitlerWindowInterruptions::everyClassIsThere()
     for (const char* part :
          {"ArchiveItem", "movable", "GraphicsView", "ToolsBar", "TextToolsPanel", "KSTreeView",
           "KSTreeHeaderView", "FolderEditor", "TemplateItem", "KSTabBar", "ColorPalette", "ColorButton",
-          "KSMenu", "SizeCombox", "FontCombox", "KSRadiobutton"}) {
+          "ArchiveMenu", "SizeCombox", "FontCombox", "KSRadiobutton"}) {
         QVERIFY2(names.contains(QLatin1String(part)), qPrintable(QLatin1String(part) + "\n" + names));
     }
 }

@@ -11,6 +11,7 @@
 #include "touchui/KSBaseItemWidget.h"
 #include "touchui/KSEventDefaultMutexLockObject.h"
 #include "touchui/KSEventProcessLockObject.h"
+#include "touchui/KSMenu.h"
 
 #include <QAbstractSlider>
 #include <QApplication>
@@ -126,6 +127,8 @@ private:
         const QRect area = widget->visibleRegion().boundingRect();
         const auto* row = qobject_cast<const KSBaseItemWidget*>(widget);
         QList<QPoint> places{area.center()};
+        if (const auto* menu = qobject_cast<const KSMenu*>(widget))
+            places.prepend(menu->getMenuItemRect(1).center()); // enabled, in all menus
         if (row != nullptr && row->hasDragFlag() && !row->getDragArea().isNull())
             places.prepend(row->getDragArea().center());
         for (const int part : {1, 3, 5, 7})
