@@ -18,8 +18,9 @@ CLOSE = (2, 8)
 PICKER = (1, 10)
 MEMORY = 300  # MB
 GROWTH = 20
-# Points of the window: the pictures of the list's first and seventh row, and places along the scroll bar.
-PICTURES = [(harness.LIST_POINT[0] - 240, harness.LIST_POINT[1] + row * harness.LIST_ROW) for row in (0, 6)]
+# Points of the window: the pictures of the list's second and seventh row (the first is opened, and
+# gets the pictures that it lacks), and places along the scroll bar.
+PICTURES = [(harness.LIST_POINT[0] - 240, harness.LIST_POINT[1] + row * harness.LIST_ROW) for row in (1, 6)]
 BAR = 30
 BAR_PLACES = (300, 500, 700, 900, 1040)
 
