@@ -10,6 +10,7 @@
 #include <QString>
 #include <algorithm>
 #include <cstring>
+#include <utility>
 
 namespace
 {
@@ -65,6 +66,10 @@ void SaveOutage::begin()
     mHasSyncFailed = mHasSyncFailed || FileSyncQueue::hasFailed();
     if (isOver())
         return;
+    // An ordinary save may have ended the last outage before this one began.
+    const unsigned long outage = RefusedWrites::outages();
+    if (std::exchange(mOutage, outage) != outage && !mHasSyncFailed)
+        end();
     if (!mTimer.isActive())
         mTimer.start();
     logRefused();

@@ -39,6 +39,7 @@ private:
 
     QTimer mTimer;
     std::set<std::string> mLogged; // paths
+    unsigned long mOutage = 0;     // the last one that RefusedWrites counted
     bool mIsTold = false;
     bool mHasSyncFailed = false;
 };

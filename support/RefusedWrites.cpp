@@ -37,6 +37,7 @@ std::function<void()> gListener;
 std::size_t gPictureBytes = 0;
 std::atomic<unsigned long> gVersion = 0;
 std::atomic<std::size_t> gCount = 0;
+std::atomic<unsigned long> gOutages = 0;
 // While this thread tries bytes again: their version. Newer ones may be kept meanwhile, and stay.
 thread_local unsigned long tTriedVersion = 0;
 
@@ -123,9 +124,11 @@ void RefusedWrites::keep(const std::string& path, std::string bytes, int error, 
             {normal(path), title.empty() ? title : normal(title), error}, std::move(bytes), ++gVersion};
         followRenames(entry.file.path);
         followRenames(entry.file.title);
+        const bool isFirst = gEntries.empty();
         eraseIf([&](const Entry& old) { return old.file.path == entry.file.path; });
         if (title.empty() || gPictureBytes + entry.bytes.size() <= PICTURE_BYTES) {
             gPictureBytes += title.empty() ? 0 : entry.bytes.size();
+            gOutages += isFirst ? 1 : 0;
             gEntries.push_back(std::move(entry));
             gCount = gEntries.size();
         }
@@ -139,6 +142,11 @@ bool RefusedWrites::find(const std::string& path, std::string& bytes)
 {
     unsigned long version = 0;
     return !isEmpty() && take(normal(path), bytes, version);
+}
+
+unsigned long RefusedWrites::outages()
+{
+    return gOutages;
 }
 
 bool RefusedWrites::isEmpty()

@@ -30,6 +30,8 @@ public:
     static bool find(const std::string& path, std::string& bytes);
 
     static bool isEmpty();
+    // Number of times that bytes were kept while none were: each is the beginning of an outage of the disk.
+    static unsigned long outages();
     static std::vector<File> files();
 
     // Tries all again, in the order in which they were kept. Returns those that are on the disk now.

@@ -151,7 +151,23 @@ class TitlerTest(unittest.TestCase):
                            stdout=subprocess.DEVNULL)
         data = self.environment["K2SYS_AC_DATA"]
         shutil.copytree(os.path.join(cls.samples, "d"), data)
+        self.rewrite_paths(data, os.path.join(cls.samples, "d"), data)
         return os.path.join(data, "defaultuser") + "/"
+
+    @staticmethod
+    def rewrite_paths(folder, before, after):
+        """Templates name their backgrounds by full paths, which have to lie below the data path."""
+        for parent, _, names in os.walk(folder):
+            for name in names:
+                if not name.endswith(".xml"):
+                    continue
+                path = os.path.join(parent, name)
+                with open(path, "r+", encoding="utf-8") as stream:
+                    text = stream.read()
+                    if before in text:
+                        stream.seek(0)
+                        stream.write(text.replace(before, after))
+                        stream.truncate()
 
     def start_programs(self):
         self.appliance = session.Appliance(BUILD, os.path.join(self.keep, "appliance.log"), self.environment)

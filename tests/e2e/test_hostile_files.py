@@ -9,7 +9,8 @@ import unittest
 import harness
 import wire
 
-MISSING_FONT, DISK_FULL_CREATE, DISK_FULL_PASTE = 109, 114, 116
+MISSING_FONT, DISK_FULL_CREATE, DISK_FULL_PASTE, CONFIRM_CLOSE = 109, 114, 116, 117
+OK = 2  # the button of a question
 MAX_FILE = 8 * 1024 * 1024
 NEST = 60
 
@@ -169,7 +170,7 @@ class TitleFolders(harness.TitlerTest):
                 write(os.path.join(folder, ".order.xml"), f'<manifest type="order">{rows}</manifest>'.encode())
                 self.open_and_close(path)
 
-    def test_an_unreadable_order_file_is_an_empty_list(self):
+    def test_an_unreadable_order_file_lists_the_titles_by_name(self):
         path = self.copied_title("unordered")
         folder = os.path.dirname(path)
         other = os.path.join(folder, "notes.txt")
@@ -180,11 +181,9 @@ class TitleFolders(harness.TitlerTest):
                 start = self.appliance.mark()
                 self.command(f'edit "{folder}"')
                 self.wait_shown()
-                # With nothing in the list a new title is begun, and the order is written anew with it.
-                self.choose_template(7)
                 self.close_window()
                 self.assertEqual(self.posted_messages(start), [])
-                self.assertEqual(len(self.titles(folder)), 1)
+                self.assertEqual([title.path for title in self.titles(folder)], [path])
                 self.assertEqual(wire.broken_files(folder), {})
         self.assertEqual(read(other), b"not a title")
 
@@ -268,14 +267,13 @@ class NoRoomOnTheDisk(harness.TitlerTest):
                 except OSError:
                     continue
 
-    def type_and_close(self, title, text):
+    def type_text(self, title, text):
         self.open_title(title)
         start = self.appliance.mark()
         self.click_tool("New Text")
         self.wait_keyboard(start)
         self.command(f"string {text}")
         self.display.wait_until_still()
-        self.close_window()
 
     def test_a_save_without_room_keeps_the_old_files(self):
         folder = self.limited_folder()
@@ -283,11 +281,19 @@ class NoRoomOnTheDisk(harness.TitlerTest):
         before = title.texts()
         if self.mounted:
             self.fill(folder)
-            self.type_and_close(title, "No room for this")
+            self.type_text(title, "No room for this")
+            start = self.appliance.mark()
+            self.click_tool("Close")
+            # Asks before anything is given up.
+            harness.session.wait_until(lambda: CONFIRM_CLOSE in self.posted_messages(start), 20 * harness.SLOW,
+                                       "the question")
+            self.command(f"message-close {CONFIRM_CLOSE} {OK}")
+            self.wait_closed(start)
             self.assertEqual(title.texts(), before)
             self.assertEqual(wire.broken_files(folder), {})
             os.remove(os.path.join(folder, "filler.bin"))
-        self.type_and_close(title, "Room again")
+        self.type_text(title, "Room again")
+        self.close_window()
         self.assertEqual(title.texts(), [*before, "Room again"])
         self.assertEqual(wire.broken_files(folder), {})
         self.wait_no_leftovers(folder)
