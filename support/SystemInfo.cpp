@@ -7,6 +7,7 @@
 
 #include <algorithm>
 #include <boost/filesystem.hpp>
+#include <ctime>
 #include <mutex>
 #include <vector>
 
@@ -184,7 +185,14 @@ bool SystemInfo::copyFile(const fs::path& source, const fs::path& target)
         return false;
     if (target.has_parent_path())
         fs::create_directories(target.parent_path(), error);
-    return AtomicFile::copy(source.native(), target.native());
+    if (!AtomicFile::copy(source.native(), target.native()))
+        return false;
+    // A copied picture stays as old beside its copied title as the original is, whatever the order of
+    // copying: one that is older than its title is made again.
+    const std::time_t written = fs::last_write_time(source, error);
+    if (!error)
+        fs::last_write_time(target, written, error);
+    return true;
 }
 
 bool SystemInfo::copyFolderFiles(const std::string& source, const std::string& target)

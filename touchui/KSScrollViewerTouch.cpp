@@ -362,7 +362,8 @@ void KSScrollViewerWidget::startHold(const wchar_t* tag)
 
 void KSScrollViewerWidget::slotHandleMenuTimer()
 {
-    if (m_press.willFlick)
+    const bool isItemGone = m_press.index >= 0 && !m_press.item;
+    if (m_press.willFlick || isItemGone)
         return;
     Q_EMIT widgetItemLongHold(m_press.item, m_press.item ? m_press.positionInItem : m_press.press, this);
 }

@@ -13,6 +13,7 @@
 #include "touchui/KSEventProcessLockObject.h"
 #include "touchui/KSMenu.h"
 
+#include <QAbstractScrollArea>
 #include <QAbstractSlider>
 #include <QApplication>
 #include <QLineEdit>
@@ -332,10 +333,12 @@ private:
         if (widget == nullptr || !widget->isVisible())
             return result + QStringList(QStringLiteral("it is not there afterwards"));
         const QStringList now = answerOf(widget);
-        // What a place on a slider does depends on where its handle is now.
-        const bool isSlider = qobject_cast<const QAbstractSlider*>(widget) != nullptr;
+        // What a place on a slider does depends on where its handle is now, that on the ground of a list on
+        // how far the list has been scrolled.
+        const bool isMovable = qobject_cast<const QAbstractSlider*>(widget) != nullptr ||
+                               qobject_cast<const QAbstractScrollArea*>(widget->parentWidget()) != nullptr;
         const bool answers = std::any_of(now.cbegin(), now.cend(), [&](const QString& signal) {
-            return isSlider || answer.contains(signal);
+            return isMovable || answer.contains(signal);
         });
         if (!answers)
             result.append(QStringLiteral("a tap afterwards gives only: ") + now.join(QLatin1Char(' ')));
