@@ -223,8 +223,9 @@ def check_end(run):
     return wrong
 
 
-def check_failed(ground, run, wanted, how="once"):
-    """After a session in which operations failed; wanted is what the same session gave when none did."""
+def check_failed(ground, run, wanted, how="once", reads_failed=False):
+    """After a session in which operations failed; wanted is what the same session gave when none did. reads_failed: reading
+    failed, too, and pictures are made without a background that cannot be read just then."""
     wrong = check_end(run) + ground.problems_of_files()
     done = [line for line in run.lines if "done" in line]
     if not done or not run.last("looked"):
@@ -241,7 +242,7 @@ def check_failed(ground, run, wanted, how="once"):
             wrong.append(f"{len(believed[folder])} titles in {folder} for {len(wanted['folders'][folder])}, nobody was told")
     if len(ground.templates()) != wanted["templates"] and not told:
         wrong.append(f"templates {ground.templates()}, nobody was told")
-    return wrong + ground.problems_of_pictures(excused)
+    return wrong + ground.problems_of_pictures(excused or reads_failed)
 
 
 def check_killed(ground, run, looked):

@@ -46,7 +46,7 @@ class Faults(unittest.TestCase):
             return faults.check_killed(self.ground, run, looked), run.last("begin").get("begin", "")
         command = "play-healed" if how == "healed" else "play"
         run = self.ground.start(command, number, error, "on" if how == "healed" else how)
-        return faults.check_failed(self.ground, run, self.wanted, how), run.hit
+        return faults.check_failed(self.ground, run, self.wanted, how, reads_failed=error == "EIO"), run.hit
 
     def cases(self):
         """Numbers of operations, errors and manners."""
