@@ -1,5 +1,6 @@
 // Titles on disk: the archive manager, its facade for the widgets, and the remembered settings.
 #include "../support/LogFixture.h"
+#include "../support/SettledFolder.h"
 #include "document/Archive.h"
 #include "document/ArchiveController.h"
 #include "document/ArchiveManager.h"
@@ -661,10 +662,7 @@ private:
         QCOMPARE(ArchiveManager::getInstance()->setArchivesSortUnderFolder(mFolder.toStdString(), rows), 1);
     }
 
-    QStringList entries() const
-    {
-        return QDir(mFolder).entryList(QDir::AllEntries | QDir::Hidden | QDir::NoDotAndDotDot, QDir::Name);
-    }
+    QStringList entries() const { return settledEntries(mFolder); }
 
     static QByteArray read(const QString& name)
     {

@@ -1,4 +1,5 @@
 // Create, paste, delete, move and focus through an undo stack: list, order file, request and reports.
+#include "../support/SettledFolder.h"
 #include "LibraryFixture.h"
 
 #include "library/ArchiveItem.h"
@@ -333,7 +334,7 @@ void tst_ArchiveCommands::createFromABlankTemplate()
     mList->createArchiveFromTemplate(&blank);
     QCOMPARE(mList->count(), 2);
     // The titles and the order, and no picture from nowhere.
-    QCOMPARE(QDir(folder).entryList(QDir::AllEntries | QDir::Hidden | QDir::NoDotAndDotDot).size(), 3);
+    QCOMPARE(settledEntries(folder).size(), 3);
     QVERIFY(stem(0) != stem(1));
 }
 

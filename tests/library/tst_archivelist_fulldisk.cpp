@@ -1,6 +1,7 @@
 // What the title list keeps and tells when the disk takes no more bytes, and what it makes of folders whose
 // order is missing or damaged.
 #include "../support/FullDisk.h"
+#include "../support/SettledFolder.h"
 #include "TitleListFixture.h"
 
 #include "document/FolderOrder.h"
@@ -267,7 +268,7 @@ void tst_ArchiveListFullDisk::refusedTitlesLeaveNothingAndAreTold()
     const QString folder = abc(QStringLiteral("refused"));
     m->open(folder);
     m->holdAndChoose(1, ArchiveAction::ACTION_COPY);
-    const Names before = QDir(folder).entryList(QDir::Files | QDir::Hidden, QDir::Name);
+    const Names before = settledEntries(folder);
     const QString templates = QDir::cleanPath(mFixture.titleRoot() + "/../usertemplates");
     const FullDisk disk;
     mMessages.take();
@@ -279,7 +280,7 @@ void tst_ArchiveListFullDisk::refusedTitlesLeaveNothingAndAreTold()
     m->holdAndChoose(0, ArchiveAction::ACTION_ADD_USER);
     QCOMPARE(mMessages.take(), (Reports{{197, QStringLiteral("UserTemplate_001")}}));
     QCOMPARE(m->stems(), (Names{"a", "b", "c"}));
-    QCOMPARE(QDir(folder).entryList(QDir::Files | QDir::Hidden, QDir::Name), before);
+    QCOMPARE(settledEntries(folder), before);
     QVERIFY(!QFileInfo::exists(templates + "/UserTemplate_001"));
 }
 

@@ -1,5 +1,6 @@
 // The folder picker without its dialog: which names are taken, what is done on the disk, and what the tree is
 // filled with.
+#include "../support/SettledFolder.h"
 #include "LibraryFixture.h"
 
 #include "library/EditorRegExpValidator.h"
@@ -34,8 +35,7 @@ QString repeated(const QString& character, int count)
 QMap<QString, QByteArray> contents(const QString& folder)
 {
     QMap<QString, QByteArray> files;
-    const QStringList names = QDir(folder).entryList(QDir::Files | QDir::Hidden);
-    for (const QString& name : names) {
+    for (const QString& name : settledEntries(folder)) {
         QFile file(folder + QLatin1Char('/') + name);
         if (file.open(QIODevice::ReadOnly))
             files.insert(name, file.readAll());

@@ -1,4 +1,5 @@
 // The thread that writes a title's pictures: what it writes, when it counts as finished, what it drops.
+#include "../support/SettledFolder.h"
 #include "HoldingReporter.h"
 #include "LibraryFixture.h"
 
@@ -86,7 +87,7 @@ void tst_PictureThread::filesAndSizes()
     thread.addArchive(archive.get(), pictures(QColor(10, 120, 230)));
     QTRY_VERIFY(thread.isThreadWaiting());
 
-    QCOMPARE(QDir(folder).entryList(QDir::Files | QDir::Hidden, QDir::Name),
+    QCOMPARE(settledEntries(folder),
              (QStringList{QStringLiteral("t_1920.png"), QStringLiteral("t_240.png"),
                           QStringLiteral("t_240S.png"), QStringLiteral("t_960.png")}));
     QCOMPARE(QImage(folder + QStringLiteral("/t_1920.png")).size(), QSize(1920, 1080));
@@ -176,8 +177,7 @@ void tst_PictureThread::namesThatLeaveTheFolderAreNotWritten()
     thread.addArchive(archive.get(), pictures(Qt::red));
     QTRY_VERIFY(thread.isThreadWaiting());
     QVERIFY(!QFile::exists(mFixture.titleRoot() + QStringLiteral("/stray.png")));
-    QCOMPARE(QDir(folder).entryList(QDir::Files | QDir::Hidden, QDir::Name),
-             (QStringList{QStringLiteral("t_240.png"), QStringLiteral("t_960.png")}));
+    QCOMPARE(settledEntries(folder), (QStringList{QStringLiteral("t_240.png"), QStringLiteral("t_960.png")}));
 }
 
 void tst_PictureThread::namesOfTitlesAreNoPictures_data()

@@ -1,4 +1,5 @@
 // Names and files of titles that are made from a template or from a copy.
+#include "../support/SettledFolder.h"
 #include "LibraryFixture.h"
 
 #include "library/TitleFileOperations.h"
@@ -226,7 +227,7 @@ void tst_TitleFileOperations::noFileIsLeftAside()
     TitlePictures pictures;
     pictures.big = pictures.middle = pictures.black = pictures.small = QByteArray("picture");
     QVERIFY(mFiles.createFromCopy(folder, *source, pictures));
-    QCOMPARE(QDir(folder).entryList(QDir::Files | QDir::Hidden).size(), 5);
+    QCOMPARE(settledEntries(folder).size(), 5);
 }
 
 void tst_TitleFileOperations::templateFolderThatCannotBeMadeIsLogged()
