@@ -1,4 +1,5 @@
 """Who may touch: one finger's widget at a time, and one process at a time, by a touch screen and the real sockets."""
+import time
 import unittest
 import zlib
 
@@ -12,6 +13,7 @@ TOUCHED, REMEMBERED = 1, 2
 BESIDE_THE_BUTTONS = (747, 41)
 BELOW_THE_BAR = (1300, 300)
 CORNER = (640, 780)
+SECOND_TITLE = (164, 269)
 
 
 class TouchLock(harness.TitlerTest):
@@ -110,6 +112,22 @@ class TouchLock(harness.TitlerTest):
         self.lock(TOUCHED, False)
         self.assertEqual(self.canvas(), self.fresh)
         self.assert_fingers_work()
+
+    def test_a_siblings_lock_during_a_tap_on_a_title_opens_no_menu(self):
+        start = self.appliance.mark()
+        self.display.down(*SECOND_TITLE)
+        session.wait_until(lambda: self.locks(start) == [(TOUCHED, True)], 20 * harness.SLOW, "the lock")
+        start = self.appliance.mark()
+        self.lock(TOUCHED, True)
+        self.display.up(*SECOND_TITLE)
+        time.sleep(1.5)  # twice what a hold takes
+        self.display.wait_until_still()
+        # Neither the menu nor a mark of the title that it would be for.
+        self.assertEqual(self.locks(start), [])
+        self.assertEqual(self.canvas(), self.fresh)
+        self.lock(TOUCHED, False)
+        self.display.tap(*SECOND_TITLE)
+        session.wait_until(lambda: self.canvas() != self.fresh, 20 * harness.SLOW, "the second title")
 
     def test_a_finger_on_the_ground_of_the_window_leaves_the_others_free(self):
         self.display.tap(*BESIDE_THE_BUTTONS)

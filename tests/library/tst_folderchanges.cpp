@@ -318,6 +318,7 @@ private Q_SLOTS:
         QVERIFY(!f.picker->editor());
         QVERIFY(!QFileInfo::exists(f.path("copy")));
         QCOMPARE(f.titles.take(), Reports());
+        QCOMPARE(f.messages.take(), (Reports{{115, QStringLiteral("folder")}}));
         // The row that stands for no folder goes with the editor.
         QTRY_COMPARE(f.names(), QStringList({"b", "c"}));
         QVERIFY(f.picker->isVisible());
