@@ -90,6 +90,7 @@ file(MAKE_DIRECTORY ${TITLER_TEST_DIR}/xdg/runtime)
 file(CHMOD ${TITLER_TEST_DIR}/xdg/runtime PERMISSIONS OWNER_READ OWNER_WRITE OWNER_EXECUTE)
 set(TITLER_TEST_ENVIRONMENT
     LC_ALL=C.UTF-8
+    QTEST_FUNCTION_TIMEOUT=1200000
     HOME=${TITLER_TEST_DIR}/home
     XDG_DATA_HOME=${TITLER_TEST_DIR}/xdg/data
     XDG_CONFIG_HOME=${TITLER_TEST_DIR}/xdg/config
@@ -101,9 +102,13 @@ set(TITLER_TEST_ENVIRONMENT
     LSAN_OPTIONS=suppressions=${CMAKE_SOURCE_DIR}/cmake/lsan.supp:print_suppressions=0
     UBSAN_OPTIONS=print_stacktrace=1:halt_on_error=1)
 
+# The time limit of a test ends what hangs. Most need seconds of it, so that a machine with much other work does not end
+# what is only slow.
+set(TITLER_TEST_SECONDS 600)
+
 # Sanitizers make everything slower, so the time limits of the tests grow by this factor.
 if(TITLER_SANITIZE)
-    set(TITLER_TEST_TIME_FACTOR 5 CACHE STRING "Factor on the time limits of the tests")
+    set(TITLER_TEST_TIME_FACTOR 2 CACHE STRING "Factor on the time limits of the tests")
 else()
     set(TITLER_TEST_TIME_FACTOR 1 CACHE STRING "Factor on the time limits of the tests")
 endif()
@@ -128,5 +133,5 @@ function(titler_add_test name)
     titler_precompile_later(${name})
     add_dependencies(${name} titler_fonts)
     add_test(NAME ${name} COMMAND ${name})
-    titler_set_test(${name} 120 QT_QPA_PLATFORM=offscreen)
+    titler_set_test(${name} ${TITLER_TEST_SECONDS} QT_QPA_PLATFORM=offscreen)
 endfunction()

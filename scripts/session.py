@@ -29,9 +29,17 @@ class SessionError(Exception):
     """Something that should have happened has not, in the time it had."""
 
 
+def deadline_after(seconds):
+    """The moment at which to give up waiting for what takes at most so many seconds on a quiet machine. On a busy one a program
+    gets a processor that much less often."""
+    busy = os.getloadavg()[0] / (os.cpu_count() or 1)
+    return time.monotonic() + seconds * (1 + busy)
+
+
 def wait_until(condition, timeout, what):
-    """Polls until condition() is true and returns its value; raises SessionError after timeout seconds."""
-    deadline = time.monotonic() + timeout
+    """Polls until condition() is true and returns its value; raises SessionError after timeout seconds, later on a busy
+    machine."""
+    deadline = deadline_after(timeout)
     while True:
         value = condition()
         if value:
@@ -244,7 +252,7 @@ class Display:
     def wait_until_still(self, timeout=60, quiet=0.3):
         """Waits until the screen has not changed for quiet seconds and no process behind it has worked at any look. On a
         busy machine a program may take longer than that to get a processor at all."""
-        deadline = time.monotonic() + timeout
+        deadline = deadline_after(timeout)
         last, since, looks = self.grab()[2], time.monotonic(), 0
         while looks < LOOKS_WHEN_STILL or time.monotonic() - since < quiet:
             if time.monotonic() > deadline:
@@ -311,7 +319,7 @@ class Appliance(Process):
 
     def wait_for(self, wanted, timeout, start, what):
         """The first event since start for which wanted(event) is true."""
-        deadline = time.monotonic() + timeout
+        deadline = deadline_after(timeout)
         with self.changed:
             while True:
                 for event in self.events[start:]:

@@ -1,6 +1,7 @@
 // A colour that is only previewed, whatever happens while the palette is open: every character gets its own
 // colour back, and neither the file, the style for the next run nor a new text learns of the preview.
 #include "../library/LibraryFixture.h"
+#include "../touchui/Taps.h"
 #include "Siblings.h"
 #include "app/APPEventFilter.h"
 #include "app/TitlerWindow.h"
@@ -174,18 +175,14 @@ void tst_TitlerWindowPalette::finger(QEventPoint::State state, const QWidget* wi
 void tst_TitlerWindowPalette::doubleTap(const QPoint& scenePlace)
 {
     const auto* view = find<GraphicsView>();
-    for (int i = 0; i < 2; ++i) {
-        finger(QEventPoint::Pressed, view, view->mapFromScene(scenePlace));
-        finger(QEventPoint::Released, view, view->mapFromScene(scenePlace));
-    }
+    tapTwice(mWindow.get(), mDevice, view->mapTo(mWindow.get(), view->mapFromScene(scenePlace)));
 }
 
 void tst_TitlerWindowPalette::tap(const QPoint& scenePlace)
 {
     auto* view = find<GraphicsView>();
     view->mouseClick(); // no double tap
-    finger(QEventPoint::Pressed, view, view->mapFromScene(scenePlace));
-    finger(QEventPoint::Released, view, view->mapFromScene(scenePlace));
+    tapOnce(mWindow.get(), mDevice, view->mapTo(mWindow.get(), view->mapFromScene(scenePlace)));
     view->mouseClick();
 }
 

@@ -1,6 +1,7 @@
 // The texts of a title on all the ways that an operator goes away from them: nothing blank is saved, an
 // emptied title is, the soft keyboard is put away; and what a new text looks like.
 #include "../library/LibraryFixture.h"
+#include "../touchui/Taps.h"
 #include "RecordingCallBack.h"
 #include "Siblings.h"
 #include "SoftKeyboardStandIn.h"
@@ -218,9 +219,7 @@ void tst_TitlerWindow_Texts::cleanup()
 
 void tst_TitlerWindow_Texts::tap(const QWidget* widget, const QPoint& place)
 {
-    const QPoint point = widget->mapTo(mWindow.get(), place);
-    QTest::touchEvent(mWindow.get(), mDevice).press(0, point);
-    QTest::touchEvent(mWindow.get(), mDevice).release(0, point);
+    tapOnce(mWindow.get(), mDevice, widget->mapTo(mWindow.get(), place));
     view()->mouseClick(); // no double tap follows
 }
 

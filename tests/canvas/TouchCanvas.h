@@ -3,6 +3,7 @@
 
 #include "CanvasFixture.h"
 
+#include "tests/touchui/Taps.h"
 #include "touchui/KSAppEventFilter.h"
 #include "touchui/TouchEventButton.h"
 
@@ -57,11 +58,7 @@ public:
         quickTap(point);
         view.mouseClick();
     }
-    void quickTap(QPoint point)
-    {
-        press(point);
-        release(point);
-    }
+    void quickTap(QPoint point) { tapOnce(view.viewport(), m_device, point); }
     // The finger goes down at the first point and is still down at the second.
     void slide(QPoint from, QPoint to)
     {

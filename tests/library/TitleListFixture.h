@@ -8,6 +8,7 @@
 #include "library/ArchiveList.h"
 #include "library/ArchiveMenu.h"
 #include "tests/touchui/ManualClock.h"
+#include "tests/touchui/Taps.h"
 #include "touchui/KSAppEventFilter.h"
 #include "touchui/KSMenu.h"
 
@@ -118,8 +119,7 @@ public:
         ArchiveMenu* open = menu();
         const QPoint row =
             open->getMenuItemRect(static_cast<int>(open->actions().indexOf(open->action(type)))).center();
-        QTest::touchEvent(open, mDevice).press(0, row, open);
-        QTest::touchEvent(open, mDevice).release(0, row, open);
+        tapOnce(open, mDevice, row);
     }
     void holdAndChoose(int row, ArchiveAction::ARCHIVE_ACTION_TYPE type)
     {

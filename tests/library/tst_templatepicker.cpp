@@ -1,5 +1,6 @@
 // The template picker under a finger, on folders.
 #include "TemplateFixture.h"
+#include "tests/touchui/Taps.h"
 #include "tests/touchui/TouchFixture.h"
 
 #include "library/ArchiveItem.h"
@@ -717,9 +718,7 @@ private:
     void tap(QWidget* widget)
     {
         QVERIFY(widget->isVisible());
-        const QPoint point = centre(widget);
-        touch().press(0, point);
-        touch().release(0, point);
+        tapOnce(mPicker.get(), mDevice, centre(widget));
     }
 
     void tapItem(TemplateTab* tab, int index)

@@ -7,6 +7,7 @@
 #include "panel/TextToolsPanel.h"
 #include "support/IPathManagerEx.h"
 #include "tests/support/LogFixture.h"
+#include "tests/touchui/Taps.h"
 
 #include <QDir>
 #include <QFile>
@@ -81,8 +82,7 @@ public:
     void touch(QWidget* widget, QPoint point)
     {
         bringOnScreen(widget, point);
-        QTest::touchEvent(widget, device.get()).press(0, point, widget);
-        QTest::touchEvent(widget, device.get()).release(0, point, widget);
+        tapOnce(widget, device.get(), point);
     }
     void tap(QWidget* widget) { touch(widget, widget->rect().center()); }
 

@@ -1,5 +1,7 @@
 #pragma once
 
+#include "Taps.h"
+
 #include "touchui/KSAppEventFilter.h"
 
 #include <QCoreApplication>
@@ -33,11 +35,7 @@ public:
     {
         QTest::touchEvent(widget, m_device).release(finger, position, widget);
     }
-    void tap(QWidget* widget, const QPoint& position) const
-    {
-        press(widget, position);
-        lift(widget, position);
-    }
+    void tap(QWidget* widget, const QPoint& position) const { tapOnce(widget, m_device, position); }
     void cancel(QWidget* widget) const
     {
         QTouchEvent event(QEvent::TouchCancel, m_device);

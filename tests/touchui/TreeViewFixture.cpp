@@ -1,5 +1,7 @@
 #include "TreeViewFixture.h"
 
+#include "Taps.h"
+
 void TreeViewFixture::initTestCase()
 {
     Q_INIT_RESOURCE(UILibrary);
@@ -36,8 +38,7 @@ void TreeViewFixture::cleanup()
 
 void TreeViewFixture::touchTap(const QPoint& point)
 {
-    QTest::touchEvent(m_area, m_device).press(0, point, m_area);
-    QTest::touchEvent(m_area, m_device).release(0, point, m_area);
+    tapOnce(m_area, m_device, point);
 }
 
 // Leaves the finger up. The list lags behind the finger, so it glides.

@@ -134,7 +134,7 @@ void TestInputContextX11::initTestCase()
     layout->addWidget(m_edit);
     m_window->resize(300, 200);
     m_window->show(); // the window manager gives a new window the focus
-    QVERIFY(QTest::qWaitForWindowActive(m_window.get()));
+    QVERIFY(QTest::qWaitForWindowActive(m_window.get(), 60000));
     m_edit->setFocus();
 }
 
@@ -201,7 +201,7 @@ void TestInputContextX11::requestWithoutAFieldGivesBackTheFocus()
     // Shown, not activated as well: the window manager would give it the focus twice, the second time perhaps
     // after the request below has given it back.
     m_second->show();
-    QVERIFY(QTest::qWaitForWindowActive(m_second.get()));
+    QVERIFY(QTest::qWaitForWindowActive(m_second.get(), 60000));
     KSInputContext* context = KSInputContext::instance();
     context->setWindowID(m_window->winId());
     const QEvent request(QEvent::RequestSoftwareInputPanel);
@@ -221,7 +221,7 @@ void TestInputContextX11::windowBehindADialogLeavesTheFocus()
     dialog.setWindowModality(Qt::WindowModal);
     dialog.resize(100, 100);
     dialog.show();
-    QVERIFY(QTest::qWaitForWindowActive(&dialog));
+    QVERIFY(QTest::qWaitForWindowActive(&dialog, 60000));
     KSInputContext* context = KSInputContext::instance();
     const auto focus = [] { return KSInputFocusManager::getInputFocusWindow(); };
     QTRY_COMPARE(focus(), static_cast<unsigned long>(dialog.winId()));
