@@ -3,8 +3,6 @@
 #include "support/DataPathCheck.h"
 #include "support/DescriptorLimit.h"
 #include "support/FileSyncQueue.h"
-#include "support/FolderLookup.h"
-#include "support/IPathManagerEx.h"
 #include "support/LeftoverSweep.h"
 #include "support/LogManager.h"
 #include "support/OwnerOnlyFiles.h"
@@ -47,18 +45,6 @@ void keepMemoryFlat()
     QPixmapCache::setCacheLimit(SMALL_PICTURES);
 }
 
-// What a process that was killed in the middle of a save left behind; the list looks after the title folders.
-void sweepSettings()
-{
-    for (const FolderLookup::Getter getter :
-         {&IPathManagerEx::getSystemSettingPath, &IPathManagerEx::getTitlerTemplatesPath,
-          &IPathManagerEx::getTemplatesPath}) {
-        const std::string folder = FolderLookup::multiByte(getter);
-        if (!folder.empty())
-            LeftoverSweep::sweepWithChildren(folder);
-    }
-}
-
 // The files are in their place; what becomes of them when the power goes now nobody knows.
 void logUnsynced()
 {
@@ -93,7 +79,7 @@ int main(int argc, char* argv[])
     const QStringList arguments = application.arguments().mid(1);
     registerSystemSignalHandler(onSystemSingleCaught, "KS2Titler");
 
-    sweepSettings();
+    LeftoverSweep::sweepProgramFolders();
     pMainWindow = new TitlerWindow(true, nullptr);
     pMainWindow->move(arguments.contains(RIGHT_OPTION) ? RIGHT_WINDOW_LEFT : 0, 0);
     pMainWindow->setRealClose(false);

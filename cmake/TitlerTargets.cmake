@@ -105,6 +105,8 @@ set(TITLER_TEST_ENVIRONMENT
 # The time limit of a test ends what hangs. Most need seconds of it, so that a machine with much other work does not end
 # what is only slow.
 set(TITLER_TEST_SECONDS 600)
+# Tests with a long form that takes hours end what hangs themselves.
+set(TITLER_LONG_FORM_SECONDS 100000)
 
 # Sanitizers make everything slower, so the time limits of the tests grow by this factor.
 if(TITLER_SANITIZE)

@@ -2,7 +2,9 @@
 
 #include "support/AtomicFile.h"
 #include "support/FileSyncQueue.h"
+#include "support/FolderLookup.h"
 #include "support/HiddenName.h"
+#include "support/IPathManagerEx.h"
 #include "support/XmlFile.h"
 
 #include <cstdint>
@@ -121,5 +123,16 @@ void LeftoverSweep::sweepWithChildren(const std::string& folder)
         struct stat status = {};
         if (name != "." && name != ".." && ::lstat(child.c_str(), &status) == 0 && S_ISDIR(status.st_mode))
             sweep(child);
+    }
+}
+
+void LeftoverSweep::sweepProgramFolders()
+{
+    for (const FolderLookup::Getter getter :
+         {&IPathManagerEx::getSystemSettingPath, &IPathManagerEx::getTitlerTemplatesPath,
+          &IPathManagerEx::getTemplatesPath}) {
+        const std::string folder = FolderLookup::multiByte(getter);
+        if (!folder.empty())
+            sweepWithChildren(folder);
     }
 }

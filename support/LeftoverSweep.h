@@ -15,6 +15,10 @@ public:
     // The same for a folder and the folders directly in it.
     static void sweepWithChildren(const std::string& folder);
 
+    // The same for the program's folders: settings, user templates and presets. The list of titles sweeps
+    // the folders of titles when it is first opened.
+    static void sweepProgramFolders();
+
     // Whether a file can be read to its end: as XML or PNG by its extension; of others only that they are not
     // empty.
     static bool isWhole(const std::string& path);

@@ -11,8 +11,6 @@
 #include "FaultShim.h"
 #include "OperatorSession.h"
 #include "support/FileSyncQueue.h"
-#include "support/FolderLookup.h"
-#include "support/IPathManagerEx.h"
 #include "support/LeftoverSweep.h"
 #include "touchui/KSInputContext.h"
 
@@ -47,17 +45,6 @@ void makeData(const QString& data)
                           (data + "/defaultuser").toStdString(), std::filesystem::copy_options::recursive);
 }
 
-// As the program does at its start.
-void sweep()
-{
-    for (const FolderLookup::Getter getter :
-         {&IPathManagerEx::getSystemSettingPath, &IPathManagerEx::getTitlerTemplatesPath}) {
-        const std::string folder = FolderLookup::multiByte(getter);
-        if (!folder.empty())
-            LeftoverSweep::sweepWithChildren(folder);
-    }
-}
-
 } // namespace
 
 int main(int argc, char** argv)
@@ -79,7 +66,7 @@ int main(int argc, char** argv)
     }
     qputenv("K2SYS_AC_ROOT", "");
     qputenv("K2SYS_AC_DATA", data.toLocal8Bit());
-    sweep();
+    LeftoverSweep::sweepProgramFolders();
     int result = 0;
     {
         OperatorSession session(data + QStringLiteral("/defaultuser/titles"));

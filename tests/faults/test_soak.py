@@ -21,7 +21,7 @@ class Soak(unittest.TestCase):
         ground.fresh()
         environment = ground.environment()
         done = subprocess.run([faults.PROGRAM, "soak", ground.data, str(SESSIONS)], env=environment, text=True,
-                              capture_output=True, check=False)
+                              capture_output=True, check=False, timeout=600 + 10 * SESSIONS)
         self.assertEqual(done.returncode, 0, done.stderr[-2000:])
         run = faults.Run(done, False)
         looks = [line for line in run.lines if "session" in line]
