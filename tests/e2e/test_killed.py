@@ -1,4 +1,4 @@
-"""A titler that is killed at any moment of its work."""
+"""A titler that is killed at any moment of its work. TITLER_KILLS is the number of kills."""
 import os
 import signal
 import unittest
@@ -7,7 +7,7 @@ import harness
 import wire
 from mortal import MortalTitler
 
-KILLS = 25
+KILLS = int(os.environ.get("TITLER_KILLS", "25"))
 
 
 class Killed(MortalTitler, harness.TitlerTest):
