@@ -2,13 +2,9 @@
 
 #include "document/ArchiveController.h"
 #include "document/ArchiveOrder.h"
-#include "messaging/ptc/CPack_Simplebuffer.h"
-#include "messaging/ptc/CSimpleBuffer.h"
+#include "messaging/services/TitlerParams.h"
 
 #include <QString>
-#include <algorithm>
-#include <cstdint>
-#include <limits>
 
 EditContextController* EditContextController::mInstance = nullptr;
 
@@ -113,13 +109,7 @@ void EditContextController::orderFilePathList(const QString& folder)
 
 void EditContextController::packSendData(const std::wstring& folder, const std::vector<std::wstring>& paths)
 {
-    simplebuffer buffer;
-    CSimpleBuffer::simplebuffer_init(&buffer, nullptr, 0);
-    const auto count = static_cast<std::uint16_t>(
-        std::min<std::size_t>(paths.size(), std::numeric_limits<std::uint16_t>::max()));
-    for (std::uint16_t i = 0; i < count; ++i)
-        CPack_Simplebuffer::pack_simplebuffer_wstring(&buffer, paths[i]);
-
+    simplebuffer buffer = TitlerParams::packPaths(paths);
     _CALLBACK_TITLER_PARAMTER record;
     record.type = mCallType;
     record.path = folder;

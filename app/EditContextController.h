@@ -13,7 +13,7 @@
 
 #include "app/TitlerParamter.h"
 #include "library/IEditContext.h"
-#include "messaging/services/ITitlerCallBack.h"
+#include "messaging/services/ITitler.h"
 #include "messaging/services/TitlerDefine.h"
 
 class ArchiveController;

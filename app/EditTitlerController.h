@@ -13,8 +13,6 @@
 #include "library/ITitlerFolderReporter.h"
 #include "messaging/services/FileManagerDefine.h"
 #include "messaging/services/IFileManagerController.h"
-#include "messaging/services/IFileManagerControllerCallBack.h"
-#include "messaging/services/IFileManagerControllerNotify.h"
 
 class TitlerToolFactory;
 

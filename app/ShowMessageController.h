@@ -12,8 +12,6 @@
 
 #include "canvas/MessageBoxController.h"
 #include "messaging/services/IMessageCenter.h"
-#include "messaging/services/IMessageCenterCallBack.h"
-#include "messaging/services/IMessageCenterNotify.h"
 #include "messaging/services/MessageDefine.h"
 
 class ShowMessageController : public MessageBoxController,

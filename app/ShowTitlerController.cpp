@@ -4,11 +4,6 @@
 #include "app/TitlerToolFactory.h"
 #include "support/LogManager.h"
 
-namespace
-{
-constexpr long SERVICE_ID = 92;
-}
-
 ShowTitlerController* ShowTitlerController::mInstance = nullptr;
 
 ShowTitlerController* ShowTitlerController::getInstance()
@@ -31,7 +26,7 @@ ShowTitlerController::ShowTitlerController()
 
 void ShowTitlerController::setFactory(TitlerToolFactory* factory)
 {
-    mProxy = factory->createService<IShowTitlerController>(SERVICE_ID);
+    mProxy = factory->createService<IShowTitlerController>();
     if (mProxy)
         mProxy->registerCallBack(this);
 }

@@ -5,7 +5,6 @@
 
 #include "app/TitlerParamter.h"
 #include "messaging/services/IShowTitlerController.h"
-#include "messaging/services/IShowTitlerControllerCallBack.h"
 #include "messaging/services/SubCommonDefine.h"
 
 class TitlerToolFactory;

@@ -4,8 +4,6 @@
 
 #include "canvas/IInputLanguageSource.h"
 #include "messaging/services/ISystemSetupManager.h"
-#include "messaging/services/ISystemSetupManagerCallBack.h"
-#include "messaging/services/ISystemSetupManagerNotify.h"
 #include "messaging/services/SystemSetupDef.h"
 
 class TitlerToolFactory;

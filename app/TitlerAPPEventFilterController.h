@@ -4,8 +4,6 @@
 
 #include "messaging/services/APPEventDefine.h"
 #include "messaging/services/IAPPEventFilter.h"
-#include "messaging/services/IAPPEventFilterCallBack.h"
-#include "messaging/services/IAPPEventFilterNotify.h"
 #include "touchui/ITitlerAPPEventFilterController.h"
 
 class TitlerAPPEventFilterController : public ITitlerAPPEventFilterController,

@@ -4,8 +4,6 @@
 #include <QObject>
 
 #include "messaging/services/IPowerManager.h"
-#include "messaging/services/IPowerManagerCallBack.h"
-#include "messaging/services/IPowerManagerNotify.h"
 
 class TitlerToolFactory;
 

@@ -4,8 +4,6 @@
 #include <QObject>
 
 #include "messaging/services/IProjectDataManager.h"
-#include "messaging/services/IProjectDataManagerCallBack.h"
-#include "messaging/services/IProjectDataManagerNotify.h"
 
 class TitlerToolFactory;
 

@@ -10,7 +10,6 @@
 #include "messaging/services/ServiceFamilies.h"
 #include "messaging/services/ServiceTable.h"
 #include "messaging/services/TitlerAdapter.h"
-#include "messaging/services/TitlerCallBackRemoteProxy.h"
 #include "support/LogManager.h"
 
 #include <functional>
@@ -131,7 +130,7 @@ PTC::IProxyBase* TitlerToolFactory::createProxy(long type, long id, long client)
 PTC::ISender* TitlerToolFactory::callBackSender(long client)
 {
     const long key = ServiceTable::senderKeyOf(client);
-    if (auto* sender = dynamic_cast<SocketRemoteSender*>(findSender(key)))
+    if (PTC::ISender* sender = findSender(key))
         return sender->beginConnect(client) ? sender : nullptr;
     auto sender = std::make_unique<SocketRemoteSender>(key);
     if (!sender->beginConnect(client))

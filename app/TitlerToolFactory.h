@@ -23,10 +23,11 @@ class QtReceiver;
 class TitlerToolFactory : public PTC::InstanceFactory
 {
 public:
-    static constexpr long TITLER_INTERFACE_ID = 117;
-    static constexpr long TITLER_CALLBACK_INTERFACE_ID = 118;
-    static constexpr long TITLER_CLIENT_NUMBER = 1003; // identity and listening port of this process
-    static constexpr long TITLER_RECEIVER_ID = 4;
+    static constexpr long TITLER_INTERFACE_ID = ITitler::INTERFACE_ID;
+    static constexpr long TITLER_CALLBACK_INTERFACE_ID = ITitlerCallBack::ADAPTER_TYPE;
+    // Identity and listening port of this process.
+    static constexpr long TITLER_CLIENT_NUMBER = ServiceTable::TITLER_CLIENT;
+    static constexpr long TITLER_RECEIVER_ID = ServiceTable::TITLER_CLIENT_KEY;
 
     TitlerToolFactory();
     ~TitlerToolFactory() override;
@@ -49,7 +50,7 @@ public:
 
     // createInstance with the interface's type: createInstance hands out the interface pointer as void*.
     template <typename Interface>
-    Interface* createService(long id)
+    Interface* createService(long id = Interface::INTERFACE_ID)
     {
         void* instance = nullptr;
         createInstance(id, &instance);

@@ -1,15 +1,13 @@
 #include "appliance/Appliance.h"
 
 #include "appliance/JsonRecords.h"
-#include "messaging/services/IAPPEventFilterCallBack.h"
-#include "messaging/services/IAPPEventFilterNotify.h"
-#include "messaging/services/IFileManagerControllerCallBack.h"
-#include "messaging/services/IMessageCenterCallBack.h"
-#include "messaging/services/IMessageCenterNotify.h"
-#include "messaging/services/IPowerManagerCallBack.h"
-#include "messaging/services/IProjectDataManagerCallBack.h"
-#include "messaging/services/ISoftKeyBoardControllerCallBack.h"
-#include "messaging/services/ISystemSetupManagerCallBack.h"
+#include "messaging/services/IAPPEventFilter.h"
+#include "messaging/services/IFileManagerController.h"
+#include "messaging/services/IMessageCenter.h"
+#include "messaging/services/IPowerManager.h"
+#include "messaging/services/IProjectDataManager.h"
+#include "messaging/services/ISoftKeyBoardController.h"
+#include "messaging/services/ISystemSetupManager.h"
 #include "messaging/services/ServiceTable.h"
 #include "messaging/services/TitlerAdapter.h"
 
@@ -141,7 +139,7 @@ void Appliance::handleCall(const ServiceDescription& service, const ServiceMetho
         if (methodName.startsWith("unregister")) {
             unregister(serviceName, methodName, args["clientId"].toInt());
         } else {
-            answer(serviceName, methodName, args);
+            answer(service.interfaceId, method.id, args);
         }
         break;
     }
@@ -155,27 +153,30 @@ void Appliance::keep(const QJsonObject& event)
     }
 }
 
-// A client that registers again, because it was started anew, gets a new id.
+template <typename CallBack>
+bool Appliance::giveClientId(void (CallBack::*give)(int), const QString& service, int id)
+{
+    if (service != CallBack::Calls::NAME || callBackOf<CallBack>() == nullptr) {
+        return false;
+    }
+    (callBackOf<CallBack>()->*give)(id);
+    return true;
+}
+
+// A client that registers again, because it was started anew, gets a new id. The services of the sub panel
+// give none.
 void Appliance::giveClientId(const QString& service)
 {
     const int id = m_lastClientId + 1;
-    if (auto* eventFilter = callBackOf<IAPPEventFilterCallBack>(service)) {
-        eventFilter->setClientID(id);
-    } else if (auto* fileManager = callBackOf<IFileManagerControllerCallBack>(service)) {
-        fileManager->getClientID(id);
-    } else if (auto* messageCenter = callBackOf<IMessageCenterCallBack>(service)) {
-        messageCenter->setClientID(id);
-    } else if (auto* power = callBackOf<IPowerManagerCallBack>(service)) {
-        power->getClientID(id);
-    } else if (auto* project = callBackOf<IProjectDataManagerCallBack>(service)) {
-        project->getClientID(id);
-    } else if (auto* setup = callBackOf<ISystemSetupManagerCallBack>(service)) {
-        setup->getClientID(id);
-    } else {
-        return; // the services of the sub panel give none
+    if (giveClientId(&IAPPEventFilterCallBack::setClientID, service, id) ||
+        giveClientId(&IFileManagerControllerCallBack::getClientID, service, id) ||
+        giveClientId(&IMessageCenterCallBack::setClientID, service, id) ||
+        giveClientId(&IPowerManagerCallBack::getClientID, service, id) ||
+        giveClientId(&IProjectDataManagerCallBack::getClientID, service, id) ||
+        giveClientId(&ISystemSetupManagerCallBack::getClientID, service, id)) {
+        m_lastClientId = id;
+        m_clients[service].clientId = id;
     }
-    m_lastClientId = id;
-    m_clients[service].clientId = id;
 }
 
 void Appliance::unregister(const QString& service, const QString& method, int clientId)
@@ -191,76 +192,81 @@ void Appliance::unregister(const QString& service, const QString& method, int cl
     }
 }
 
-void Appliance::answer(const QString& service, const QString& method, const QJsonObject& args)
+void Appliance::answer(long interfaceId, long method, const QJsonObject& args)
 {
-    if (service == "MessageCenter") {
-        answerMessageCenter(method, args);
-    } else if (service == "APPEventFilter") {
-        answerEventFilter(method, args);
-    } else if (service == "SoftKeyBoardController") {
-        answerKeyboard(method, args);
-    } else if (service == "SystemSetupManager") {
-        answerSystemSetup(method);
+    switch (interfaceId) {
+    case IMessageCenter::INTERFACE_ID:
+        return answerMessageCenter(method, args);
+    case IAPPEventFilter::INTERFACE_ID:
+        return answerEventFilter(method, args);
+    case ISoftKeyBoardController::INTERFACE_ID:
+        return answerKeyboard(method, args);
+    case ISystemSetupManager::INTERFACE_ID:
+        return answerSystemSetup(method);
+    default:
+        break;
     }
 }
 
-void Appliance::answerMessageCenter(const QString& method, const QJsonObject& args)
+void Appliance::answerMessageCenter(long method, const QJsonObject& args)
 {
-    auto* callBack = callBackOf<IMessageCenterCallBack>("MessageCenter");
-    auto* notify = notifyOf<IMessageCenterNotify>("MessageCenter");
-    if (method == "setTopWindow") {
+    auto* callBack = callBackOf<IMessageCenterCallBack>();
+    auto* notify = notifyOf<IMessageCenterNotify>();
+    if (method == IMessageCenter::METHOD_setTopWindow) {
         state.topWindow = args["topWindow"].toInt();
         if (notify != nullptr) {
             notify->getTopWindowNotify(state.topWindow);
         }
-    } else if (method == "getTopWindow" && callBack != nullptr) {
+    } else if (method == IMessageCenter::METHOD_getTopWindow && callBack != nullptr) {
         callBack->getTopWindowCallBack(state.topWindow);
-    } else if (method == "postMessage" && notify != nullptr) {
-        notify->postMessageNotify(JsonRecords::message(args));
-    } else if (method == "showBar" && notify != nullptr) {
+    } else if (method == IMessageCenter::METHOD_postMessage && notify != nullptr) {
+        notify->postMessageNotify(JsonRecords::fromJson<MessageDefine::_tagMessageParam>(args));
+    } else if (method == IMessageCenter::METHOD_showBar && notify != nullptr) {
         notify->showBarNotify(args["bar"].toInt());
     }
 }
 
-void Appliance::answerEventFilter(const QString& method, const QJsonObject& args)
+void Appliance::answerEventFilter(long method, const QJsonObject& args)
 {
-    auto* notify = notifyOf<IAPPEventFilterNotify>("APPEventFilter");
+    auto* notify = notifyOf<IAPPEventFilterNotify>();
     if (notify == nullptr || !options.eventEcho) {
         return;
     }
-    if (method == "postAPPEventFilter") {
-        notify->postAPPEventFilterNotify(JsonRecords::appEvent(args));
-    } else if (method == "postRestoreOriginal") {
-        notify->postRestoreOriginalNotify(JsonRecords::appEvent(args));
-    } else if (method == "postRestoreFocus") {
+    if (method == IAPPEventFilter::METHOD_postAPPEventFilter) {
+        notify->postAPPEventFilterNotify(JsonRecords::fromJson<APPEventDefine::_tagAPPEvent>(args));
+    } else if (method == IAPPEventFilter::METHOD_postRestoreOriginal) {
+        notify->postRestoreOriginalNotify(JsonRecords::fromJson<APPEventDefine::_tagAPPEvent>(args));
+    } else if (method == IAPPEventFilter::METHOD_postRestoreFocus) {
         notify->postRestoreFocusNotify();
     }
 }
 
-void Appliance::answerKeyboard(const QString& method, const QJsonObject& args)
+void Appliance::answerKeyboard(long method, const QJsonObject& args)
 {
-    auto* callBack = callBackOf<ISoftKeyBoardControllerCallBack>("SoftKeyBoardController");
+    using Keyboard = ISoftKeyBoardController;
+    auto* callBack = callBackOf<ISoftKeyBoardControllerCallBack>();
     if (callBack == nullptr) {
         return;
     }
-    if (method == "sendKey" && options.keyEcho) {
-        callBack->sendKey(JsonRecords::key(args));
-    } else if ((method == "close" || method == "dummyClose" || method == "simpleClose") &&
+    if (method == Keyboard::METHOD_sendKey && options.keyEcho) {
+        callBack->sendKey(JsonRecords::fromJson<SubCommonDefine::tagSoftKeyBoardKeyData>(args));
+    } else if ((method == Keyboard::METHOD_close || method == Keyboard::METHOD_dummyClose ||
+                method == Keyboard::METHOD_simpleClose) &&
                options.stateOnClose) {
         callBack->sendSoftKeyboardState(false);
     }
 }
 
-void Appliance::answerSystemSetup(const QString& method)
+void Appliance::answerSystemSetup(long method)
 {
-    auto* callBack = callBackOf<ISystemSetupManagerCallBack>("SystemSetupManager");
+    auto* callBack = callBackOf<ISystemSetupManagerCallBack>();
     if (callBack == nullptr) {
         return;
     }
-    if (method == "getLanguageInfo") {
+    if (method == ISystemSetupManager::METHOD_getLanguageInfo) {
         callBack->getLanguageInfoCallBack(
-            {clientIdOf("SystemSetupManager"), state.systemLanguage, state.inputLanguage});
-    } else if (method == "getInformation") {
+            {clientIdOf(ISystemSetupManager::NAME), state.systemLanguage, state.inputLanguage});
+    } else if (method == ISystemSetupManager::METHOD_getInformation) {
         callBack->getInformationCallBack({state.module});
     }
 }

@@ -5,7 +5,6 @@
 #include "appliance/Sibling.h"
 #include "messaging/ptc/IProxyBase.h"
 #include "messaging/services/ITitler.h"
-#include "messaging/services/ITitlerCallBack.h"
 
 #include <QJsonArray>
 #include <QString>
@@ -37,15 +36,15 @@ public:
     bool registerAtTitler();
 
     // The client's side of a service, by its interface. Null until a client has registered it.
-    template <typename Interface>
-    Interface* callBackOf(const QString& service)
+    template <typename CallBack>
+    CallBack* callBackOf()
     {
-        return dynamic_cast<Interface*>(m_clients[service].callBack.get());
+        return dynamic_cast<CallBack*>(m_clients[CallBack::Calls::NAME].callBack.get());
     }
-    template <typename Interface>
-    Interface* notifyOf(const QString& service)
+    template <typename Notify>
+    Notify* notifyOf()
     {
-        return dynamic_cast<Interface*>(m_clients[service].notify.get());
+        return dynamic_cast<Notify*>(m_clients[Notify::Calls::NAME].notify.get());
     }
     // The id that the service gave its client, -1 before.
     int clientIdOf(const QString& service);
@@ -91,12 +90,15 @@ private:
                     std::unique_ptr<PTC::IProxyBase> proxy);
     void keep(const QJsonObject& event);
     void giveClientId(const QString& service);
+    template <typename CallBack>
+    bool giveClientId(void (CallBack::*give)(int), const QString& service, int id);
     void unregister(const QString& service, const QString& method, int clientId);
-    void answer(const QString& service, const QString& method, const QJsonObject& args);
-    void answerMessageCenter(const QString& method, const QJsonObject& args);
-    void answerEventFilter(const QString& method, const QJsonObject& args);
-    void answerKeyboard(const QString& method, const QJsonObject& args);
-    void answerSystemSetup(const QString& method);
+    // method is the id of a method of the service.
+    void answer(long interfaceId, long method, const QJsonObject& args);
+    void answerMessageCenter(long method, const QJsonObject& args);
+    void answerEventFilter(long method, const QJsonObject& args);
+    void answerKeyboard(long method, const QJsonObject& args);
+    void answerSystemSetup(long method);
 
     EventSink m_sink;
     std::map<QString, Client> m_clients;

@@ -1,15 +1,14 @@
 #include "appliance/CommandInterpreter.h"
 
 #include "appliance/KeyStrokes.h"
-#include "messaging/services/IAPPEventFilterNotify.h"
-#include "messaging/services/IFileManagerControllerNotify.h"
-#include "messaging/services/IMessageCenterNotify.h"
-#include "messaging/services/IPowerManagerNotify.h"
-#include "messaging/services/IProjectDataManagerNotify.h"
-#include "messaging/services/IShowTitlerControllerCallBack.h"
-#include "messaging/services/ISoftKeyBoardControllerCallBack.h"
-#include "messaging/services/ISystemSetupManagerCallBack.h"
-#include "messaging/services/ISystemSetupManagerNotify.h"
+#include "messaging/services/IAPPEventFilter.h"
+#include "messaging/services/IFileManagerController.h"
+#include "messaging/services/IMessageCenter.h"
+#include "messaging/services/IPowerManager.h"
+#include "messaging/services/IProjectDataManager.h"
+#include "messaging/services/IShowTitlerController.h"
+#include "messaging/services/ISoftKeyBoardController.h"
+#include "messaging/services/ISystemSetupManager.h"
 
 namespace
 {
@@ -127,25 +126,24 @@ CommandInterpreter::withTitler(std::function<QString(ITitler& titler, const Comm
     };
 }
 
-template <typename Interface>
+template <typename Notify>
 CommandInterpreter::Handler
-CommandInterpreter::withNotify(const QString& service,
-                               std::function<QString(Interface& client, const CommandLine&)> action)
+CommandInterpreter::withNotify(std::function<QString(Notify& client, const CommandLine&)> action)
 {
-    return [this, service, action](const CommandLine& command) {
-        auto* client = m_appliance.notifyOf<Interface>(service);
-        return client != nullptr ? action(*client, command) : service + " has no client";
+    return [this, action](const CommandLine& command) {
+        auto* client = m_appliance.notifyOf<Notify>();
+        return client != nullptr ? action(*client, command) : QString(Notify::Calls::NAME) + " has no client";
     };
 }
 
-template <typename Interface>
+template <typename CallBack>
 CommandInterpreter::Handler
-CommandInterpreter::withCallBack(const QString& service,
-                                 std::function<QString(Interface& client, const CommandLine&)> action)
+CommandInterpreter::withCallBack(std::function<QString(CallBack& client, const CommandLine&)> action)
 {
-    return [this, service, action](const CommandLine& command) {
-        auto* client = m_appliance.callBackOf<Interface>(service);
-        return client != nullptr ? action(*client, command) : service + " has no client";
+    return [this, action](const CommandLine& command) {
+        auto* client = m_appliance.callBackOf<CallBack>();
+        return client != nullptr ? action(*client, command)
+                                 : QString(CallBack::Calls::NAME) + " has no client";
     };
 }
 
@@ -188,7 +186,7 @@ void CommandInterpreter::addTitlerCommands()
         return valid ? QString() : QString(BAD_NUMBER);
     });
     m_handlers["sub"] = withCallBack<IShowTitlerControllerCallBack>(
-        "ShowTitlerController", [](IShowTitlerControllerCallBack& client, const CommandLine&) {
+        [](IShowTitlerControllerCallBack& client, const CommandLine&) {
             client.showTitler();
             return QString();
         });
@@ -197,13 +195,11 @@ void CommandInterpreter::addTitlerCommands()
 void CommandInterpreter::addKeyboardCommands()
 {
     using Keyboard = ISoftKeyBoardControllerCallBack;
-    const QString service = "SoftKeyBoardController";
     const auto addText = [&](const char* word, void (Keyboard::*send)(std::wstring)) {
-        m_handlers[word] =
-            withCallBack<Keyboard>(service, [send](Keyboard& client, const CommandLine& command) {
-                (client.*send)(command.rest().toStdWString());
-                return QString();
-            });
+        m_handlers[word] = withCallBack<Keyboard>([send](Keyboard& client, const CommandLine& command) {
+            (client.*send)(command.rest().toStdWString());
+            return QString();
+        });
     };
     addText("string", &Keyboard::sendInputString);
     addText("string-enter", &Keyboard::sendInputStringOnEnterPressing);
@@ -214,22 +210,20 @@ void CommandInterpreter::addKeyboardCommands()
         }
         return QString();
     };
-    m_handlers["key"] =
-        withCallBack<Keyboard>(service, [sendKeys](Keyboard& client, const CommandLine& command) {
-            const auto named = KeyStrokes::ofName(command.rest());
-            return sendKeys(client, named.empty() ? KeyStrokes::ofText(command.rest()) : named);
-        });
-    m_handlers["key-text"] =
-        withCallBack<Keyboard>(service, [sendKeys](Keyboard& client, const CommandLine& command) {
-            return sendKeys(client, KeyStrokes::ofText(command.rest()));
-        });
-    m_handlers["key-close"] = withCallBack<Keyboard>(service, [](Keyboard& client, const CommandLine&) {
+    m_handlers["key"] = withCallBack<Keyboard>([sendKeys](Keyboard& client, const CommandLine& command) {
+        const auto named = KeyStrokes::ofName(command.rest());
+        return sendKeys(client, named.empty() ? KeyStrokes::ofText(command.rest()) : named);
+    });
+    m_handlers["key-text"] = withCallBack<Keyboard>([sendKeys](Keyboard& client, const CommandLine& command) {
+        return sendKeys(client, KeyStrokes::ofText(command.rest()));
+    });
+    m_handlers["key-close"] = withCallBack<Keyboard>([](Keyboard& client, const CommandLine&) {
         SubCommonDefine::tagSoftKeyBoardKeyData key;
         key.eventType = KeyStrokes::KEYBOARD_CLOSED;
         client.sendKey(key);
         return QString();
     });
-    m_handlers["cursor"] = withCallBack<Keyboard>(service, [](Keyboard& client, const CommandLine& command) {
+    m_handlers["cursor"] = withCallBack<Keyboard>([](Keyboard& client, const CommandLine& command) {
         bool valid = true;
         const SubCommonDefine::tagSoftKeyBoardKeyTextSelectionPos position{
             command.number(0, &valid), command.number(1, &valid), command.number(2, &valid),
@@ -239,31 +233,30 @@ void CommandInterpreter::addKeyboardCommands()
         }
         return valid ? QString() : QString(BAD_NUMBER);
     });
-    m_handlers["keyboard-state"] =
-        withCallBack<Keyboard>(service, [](Keyboard& client, const CommandLine& command) {
-            bool valid = true;
-            const bool shown = command.number(0, &valid) != 0;
-            if (valid) {
-                client.sendSoftKeyboardState(shown);
-            }
-            return valid ? QString() : QString(BAD_NUMBER);
-        });
+    m_handlers["keyboard-state"] = withCallBack<Keyboard>([](Keyboard& client, const CommandLine& command) {
+        bool valid = true;
+        const bool shown = command.number(0, &valid) != 0;
+        if (valid) {
+            client.sendSoftKeyboardState(shown);
+        }
+        return valid ? QString() : QString(BAD_NUMBER);
+    });
 }
 
 void CommandInterpreter::addServiceCommands()
 {
-    m_handlers["message-close"] = withNotify<IMessageCenterNotify>(
-        "MessageCenter", [this](IMessageCenterNotify& client, const CommandLine& command) {
-            bool valid = true;
-            const int messageId = command.number(0, &valid);
-            const int closeType = command.number(1, &valid);
-            if (valid) {
-                client.closeMessageNotify({m_appliance.clientIdOf("MessageCenter"), closeType, messageId});
-            }
-            return valid ? QString() : QString(BAD_NUMBER);
-        });
-    m_handlers["top-window"] = withNotify<IMessageCenterNotify>(
-        "MessageCenter", [this](IMessageCenterNotify& client, const CommandLine& command) {
+    m_handlers["message-close"] = withNotify<IMessageCenterNotify>([this](IMessageCenterNotify& client,
+                                                                          const CommandLine& command) {
+        bool valid = true;
+        const int messageId = command.number(0, &valid);
+        const int closeType = command.number(1, &valid);
+        if (valid) {
+            client.closeMessageNotify({m_appliance.clientIdOf(IMessageCenter::NAME), closeType, messageId});
+        }
+        return valid ? QString() : QString(BAD_NUMBER);
+    });
+    m_handlers["top-window"] =
+        withNotify<IMessageCenterNotify>([this](IMessageCenterNotify& client, const CommandLine& command) {
             bool valid = true;
             const int topWindow = command.number(0, &valid);
             if (valid) {
@@ -273,17 +266,17 @@ void CommandInterpreter::addServiceCommands()
             return valid ? QString() : QString(BAD_NUMBER);
         });
     m_handlers["power-off"] =
-        withNotify<IPowerManagerNotify>("PowerManager", [](IPowerManagerNotify& client, const CommandLine&) {
+        withNotify<IPowerManagerNotify>([](IPowerManagerNotify& client, const CommandLine&) {
             client.powerOff();
             return QString();
         });
     m_handlers["power-on"] =
-        withNotify<IPowerManagerNotify>("PowerManager", [](IPowerManagerNotify& client, const CommandLine&) {
+        withNotify<IPowerManagerNotify>([](IPowerManagerNotify& client, const CommandLine&) {
             client.powerOn();
             return QString();
         });
     m_handlers["load-project"] = withNotify<IProjectDataManagerNotify>(
-        "ProjectDataManager", [](IProjectDataManagerNotify& client, const CommandLine& command) {
+        [](IProjectDataManagerNotify& client, const CommandLine& command) {
             bool valid = true;
             const int projectState = command.number(0, &valid);
             if (valid) {
@@ -293,12 +286,12 @@ void CommandInterpreter::addServiceCommands()
         });
     const auto event = [this](const CommandLine& command, int receiverIndex, bool* valid) {
         APPEventDefine::_tagAPPEvent announcement;
-        announcement.clientId = m_appliance.clientIdOf("APPEventFilter");
+        announcement.clientId = m_appliance.clientIdOf(IAPPEventFilter::NAME);
         announcement.eventReceiver = command.number(receiverIndex, 0, valid);
         return announcement;
     };
-    m_handlers["lock"] = withNotify<IAPPEventFilterNotify>(
-        "APPEventFilter", [event](IAPPEventFilterNotify& client, const CommandLine& command) {
+    m_handlers["lock"] =
+        withNotify<IAPPEventFilterNotify>([event](IAPPEventFilterNotify& client, const CommandLine& command) {
             bool valid = true;
             APPEventDefine::_tagAPPEvent announcement = event(command, 2, &valid);
             announcement.lockType = command.number(0, &valid);
@@ -308,8 +301,8 @@ void CommandInterpreter::addServiceCommands()
             }
             return valid ? QString() : QString(BAD_NUMBER);
         });
-    m_handlers["restore-original"] = withNotify<IAPPEventFilterNotify>(
-        "APPEventFilter", [event](IAPPEventFilterNotify& client, const CommandLine& command) {
+    m_handlers["restore-original"] =
+        withNotify<IAPPEventFilterNotify>([event](IAPPEventFilterNotify& client, const CommandLine& command) {
             bool valid = true;
             const APPEventDefine::_tagAPPEvent announcement = event(command, 0, &valid);
             if (valid) {
@@ -317,8 +310,8 @@ void CommandInterpreter::addServiceCommands()
             }
             return valid ? QString() : QString(BAD_NUMBER);
         });
-    m_handlers["restore-focus"] = withNotify<IAPPEventFilterNotify>(
-        "APPEventFilter", [](IAPPEventFilterNotify& client, const CommandLine&) {
+    m_handlers["restore-focus"] =
+        withNotify<IAPPEventFilterNotify>([](IAPPEventFilterNotify& client, const CommandLine&) {
             client.postRestoreFocusNotify();
             return QString();
         });
@@ -327,22 +320,20 @@ void CommandInterpreter::addServiceCommands()
 void CommandInterpreter::addFileCommands()
 {
     using Files = IFileManagerControllerNotify;
-    const QString service = "FileManagerController";
-    m_handlers["rename-folder"] =
-        withNotify<Files>(service, [this](Files& client, const CommandLine& command) {
-            const QStringList names = command.arguments();
-            if (names.size() != 2) {
-                return QString(BAD_COUNT);
-            }
-            client.updateFolderNameInCurrentProjectNotify({m_appliance.clientIdOf("FileManagerController"),
-                                                           names[0].toStdWString(), names[1].toStdWString()});
-            return QString();
-        });
-    m_handlers["delete-folder"] = withNotify<Files>(service, [](Files& client, const CommandLine& command) {
+    m_handlers["rename-folder"] = withNotify<Files>([this](Files& client, const CommandLine& command) {
+        const QStringList names = command.arguments();
+        if (names.size() != 2) {
+            return QString(BAD_COUNT);
+        }
+        client.updateFolderNameInCurrentProjectNotify({m_appliance.clientIdOf(IFileManagerController::NAME),
+                                                       names[0].toStdWString(), names[1].toStdWString()});
+        return QString();
+    });
+    m_handlers["delete-folder"] = withNotify<Files>([](Files& client, const CommandLine& command) {
         client.updateTitlerFolderInFileManagerDelete(command.rest().toStdWString());
         return QString();
     });
-    m_handlers["import"] = withNotify<Files>(service, [](Files& client, const CommandLine& command) {
+    m_handlers["import"] = withNotify<Files>([](Files& client, const CommandLine& command) {
         bool valid = true;
         FileManagerDefine::tagImportNotify notice;
         notice.fileType = command.number(0, &valid);
@@ -353,14 +344,14 @@ void CommandInterpreter::addFileCommands()
         client.importNotify(notice);
         return QString();
     });
-    m_handlers["delete-template"] = withNotify<Files>(service, [](Files& client, const CommandLine& command) {
+    m_handlers["delete-template"] = withNotify<Files>([](Files& client, const CommandLine& command) {
         FileManagerDefine::tagDeleteNotify notice;
         notice.fileType = FileManagerDefine::FILE_TYPE_TITLER_TEMPLATE;
         notice.path = command.rest().toStdWString();
         client.deleteNotify(notice);
         return QString();
     });
-    m_handlers["rename-template"] = withNotify<Files>(service, [](Files& client, const CommandLine& command) {
+    m_handlers["rename-template"] = withNotify<Files>([](Files& client, const CommandLine& command) {
         const QStringList names = command.arguments();
         if (names.size() != 3) {
             return QString(BAD_COUNT);
@@ -378,8 +369,7 @@ void CommandInterpreter::addFileCommands()
 // State is kept also while no client is there, and answered to the next.
 void CommandInterpreter::addStateCommands()
 {
-    const QString service = "SystemSetupManager";
-    m_handlers["language"] = [this, service](const CommandLine& command) {
+    m_handlers["language"] = [this](const CommandLine& command) {
         bool valid = true;
         const int systemLanguage = command.number(0, &valid);
         const int inputLanguage = command.number(1, &valid);
@@ -388,21 +378,22 @@ void CommandInterpreter::addStateCommands()
         }
         m_appliance.state.systemLanguage = systemLanguage;
         m_appliance.state.inputLanguage = inputLanguage;
-        if (auto* client = m_appliance.callBackOf<ISystemSetupManagerCallBack>(service)) {
-            client->getLanguageInfoCallBack({m_appliance.clientIdOf(service), systemLanguage, inputLanguage});
+        if (auto* client = m_appliance.callBackOf<ISystemSetupManagerCallBack>()) {
+            client->getLanguageInfoCallBack(
+                {m_appliance.clientIdOf(ISystemSetupManager::NAME), systemLanguage, inputLanguage});
         }
         return QString();
     };
     const auto addLanguage = [&](const char* word, int Appliance::State::*field,
                                  void (ISystemSetupManagerNotify::*send)(int)) {
-        m_handlers[word] = [this, service, field, send](const CommandLine& command) {
+        m_handlers[word] = [this, field, send](const CommandLine& command) {
             bool valid = true;
             const int language = command.number(0, &valid);
             if (!valid) {
                 return QString(BAD_NUMBER);
             }
             m_appliance.state.*field = language;
-            if (auto* client = m_appliance.notifyOf<ISystemSetupManagerNotify>(service)) {
+            if (auto* client = m_appliance.notifyOf<ISystemSetupManagerNotify>()) {
                 (client->*send)(language);
             }
             return QString();
@@ -412,14 +403,14 @@ void CommandInterpreter::addStateCommands()
                 &ISystemSetupManagerNotify::setSystemLanguageNotify);
     addLanguage("input-language", &Appliance::State::inputLanguage,
                 &ISystemSetupManagerNotify::setInputLanguageNotify);
-    m_handlers["module"] = [this, service](const CommandLine& command) {
+    m_handlers["module"] = [this](const CommandLine& command) {
         bool valid = true;
         const int module = command.number(0, &valid);
         if (!valid) {
             return QString(BAD_NUMBER);
         }
         m_appliance.state.module = module;
-        if (auto* client = m_appliance.callBackOf<ISystemSetupManagerCallBack>(service)) {
+        if (auto* client = m_appliance.callBackOf<ISystemSetupManagerCallBack>()) {
             client->getInformationCallBack({module});
         }
         return QString();

@@ -51,12 +51,10 @@ private:
     void addWaitCommands();
     void addOption(const QString& word, bool Appliance::Options::*option);
 
-    template <typename Interface>
-    Handler withNotify(const QString& service,
-                       std::function<QString(Interface& client, const CommandLine&)> action);
-    template <typename Interface>
-    Handler withCallBack(const QString& service,
-                         std::function<QString(Interface& client, const CommandLine&)> action);
+    template <typename Notify>
+    Handler withNotify(std::function<QString(Notify& client, const CommandLine&)> action);
+    template <typename CallBack>
+    Handler withCallBack(std::function<QString(CallBack& client, const CommandLine&)> action);
     Handler withTitler(std::function<QString(ITitler& titler, const CommandLine&)> action);
 
     void runLines();

@@ -1,35 +1,75 @@
 // The records of the wire as JSON objects, with the fields' own names.
 #pragma once
 
-#include "messaging/services/APPEventDefine.h"
-#include "messaging/services/FileManagerDefine.h"
-#include "messaging/services/MessageDefine.h"
-#include "messaging/services/SubCommonDefine.h"
-#include "messaging/services/TitlerDefine.h"
+#include "messaging/services/RecordPacking.h"
 
+#include <QJsonArray>
 #include <QJsonObject>
+#include <QString>
 
 namespace JsonRecords
 {
 
-QJsonObject toJson(const APPEventDefine::_tagAPPEvent& record);
-QJsonObject toJson(const FileManagerDefine::tagTitleChangeStatusParam& record);
-QJsonObject toJson(const FileManagerDefine::tagTitlerPathParam& record);
-QJsonObject toJson(const FileManagerDefine::tagChangeFolderNameParam& record);
-QJsonObject toJson(const MessageDefine::_tagTopWindowParam& record);
-QJsonObject toJson(const MessageDefine::_tagMessageParam& record);
-QJsonObject toJson(const MessageDefine::_tagCloseParam& record);
-QJsonObject toJson(const SubCommonDefine::tagFOLDER_TYPE& record);
-QJsonObject toJson(const SubCommonDefine::tagSoftKeyBoardInitData& record);
-QJsonObject toJson(const SubCommonDefine::tagSoftKeyBoardKeyData& record);
-QJsonObject toJson(const SubCommonDefine::taLimitInfo& record);
-QJsonObject toJson(const _tagCallBackInfo& record);
-QJsonObject toJson(const _tagNotifyInfo& record);
+inline QJsonValue toValue(int value)
+{
+    return value;
+}
+inline QJsonValue toValue(bool value)
+{
+    return value;
+}
+inline QJsonValue toValue(long value)
+{
+    return static_cast<qint64>(value);
+}
+inline QJsonValue toValue(const std::wstring& value)
+{
+    return QString::fromStdWString(value);
+}
+template <typename Value, std::size_t COUNT>
+QJsonValue toValue(const Value (&values)[COUNT])
+{
+    QJsonArray array;
+    for (const Value& value : values) {
+        array.append(toValue(value));
+    }
+    return array;
+}
+
+template <RecordPacking::HasFields Record>
+QJsonObject toJson(const Record& record)
+{
+    QJsonObject json;
+    Record::forEachField(record, [&json](auto, const char* field, const auto& value) {
+        json.insert(QLatin1String(field), toValue(value));
+    });
+    return json;
+}
 // With the paths unpacked.
 QJsonObject toJson(const _CALLBACK_TITLER_PARAMTER& record);
 
-APPEventDefine::_tagAPPEvent appEvent(const QJsonObject& json);
-MessageDefine::_tagMessageParam message(const QJsonObject& json);
-SubCommonDefine::tagSoftKeyBoardKeyData key(const QJsonObject& json);
+inline void fromValue(const QJsonValue& json, int& value)
+{
+    value = json.toInt();
+}
+inline void fromValue(const QJsonValue& json, bool& value)
+{
+    value = json.toBool();
+}
+inline void fromValue(const QJsonValue& json, std::wstring& value)
+{
+    value = json.toString().toStdWString();
+}
+
+// Returns a record of numbers and texts. A field that the object does not have is zero or empty.
+template <RecordPacking::HasFields Record>
+Record fromJson(const QJsonObject& json)
+{
+    Record record;
+    Record::forEachField(record, [&json](auto, const char* field, auto& value) {
+        fromValue(json[QLatin1String(field)], value);
+    });
+    return record;
+}
 
 } // namespace JsonRecords

@@ -20,7 +20,7 @@ void ServiceAdapter::receive(PTC::Event* event)
     if (method == m_service.methods.end()) {
         return;
     }
-    const QJsonObject args = method->decode(event->getData(), event->getSize());
+    const QJsonObject args = method->decode(method->parameter, event->getData(), event->getSize());
     m_handler(m_service, *method, args, proxyFor(*method, args));
 }
 

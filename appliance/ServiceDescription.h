@@ -1,17 +1,21 @@
 // What the services of the appliance take: their methods by id, with the parameters as JSON.
 #pragma once
 
+#include "messaging/services/ServiceCall.h"
+
 #include <QJsonObject>
 
 #include <vector>
 
 struct ServiceMethod {
-    enum class Kind { Call, RegisterCallBack, RegisterNotify };
+    using Kind = ServiceCall::Kind;
 
     long id;
     const char* name;
     Kind kind;
-    QJsonObject (*decode)(void* data, long size); // bad data gives zero values
+    const char* parameter; // name of the parameter, "" without one
+    // Returns the fields of the parameter, or a single value under its name; zero values for bad data.
+    QJsonObject (*decode)(const char* parameter, void* data, long size);
 };
 
 struct ServiceDescription {

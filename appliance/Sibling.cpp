@@ -1,12 +1,10 @@
 #include "appliance/Sibling.h"
 
-#include "appliance/ClientProxyFactory.h"
-#include "appliance/TitlerCallBackAdapter.h"
-#include "appliance/TitlerRemoteProxy.h"
 #include "messaging/ptc/CallbackProxy.h"
 #include "messaging/ptc/QtReceiver.h"
 #include "messaging/ptc/SocketRemoteReceiver.h"
 #include "messaging/ptc/SocketRemoteSender.h"
+#include "messaging/services/ServiceFamilies.h"
 #include "messaging/services/ServiceTable.h"
 #include "messaging/services/TitlerAdapter.h"
 
@@ -61,7 +59,7 @@ PTC::IAdapterBase* Sibling::createAdapter(long type, PTC::IReceiver* receiver, v
 
 PTC::IProxyBase* Sibling::createProxy(long type, long id, long client)
 {
-    std::unique_ptr<PTC::CallbackProxy> proxy(createClientProxy(type, id));
+    std::unique_ptr<PTC::CallbackProxy> proxy(ServiceFamilies::createClientProxy(type, id));
     SocketRemoteSender* sender = proxy != nullptr ? senderTo(client) : nullptr;
     if (sender == nullptr) {
         return nullptr;

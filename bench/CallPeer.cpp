@@ -5,9 +5,9 @@
 #include "messaging/ptc/SocketFrame.h"
 #include "messaging/ptc/SocketRemoteReceiver.h"
 #include "messaging/ptc/SocketRemoteSender.h"
-#include "messaging/services/ITitlerCallBack.h"
+#include "messaging/services/ITitler.h"
+#include "messaging/services/ServiceFamilies.h"
 #include "messaging/services/TitlerAdapter.h"
-#include "messaging/services/TitlerCallBackRemoteProxy.h"
 
 #include <QCoreApplication>
 #include <array>

@@ -7,17 +7,8 @@
 #include "messaging/ptc/QtReceiver.h"
 #include "messaging/ptc/SocketFrame.h"
 #include "messaging/ptc/SocketRemoteReceiver.h"
-#include "messaging/services/APPEventFilterRemoteProxy.h"
-#include "messaging/services/FileManagerControllerRemoteProxy.h"
-#include "messaging/services/MessageCenterRemoteProxy.h"
-#include "messaging/services/PowerManagerRemoteProxy.h"
-#include "messaging/services/ProjectDataManagerRemoteProxy.h"
 #include "messaging/services/ServiceFamilies.h"
-#include "messaging/services/ShowTitlerControllerRemoteProxy.h"
-#include "messaging/services/SoftKeyBoardControllerRemoteProxy.h"
-#include "messaging/services/SystemSetupManagerRemoteProxy.h"
 #include "messaging/services/TitlerAdapter.h"
-#include "messaging/services/TitlerCallBackRemoteProxy.h"
 
 #include <QCoreApplication>
 #include <algorithm>

@@ -2,22 +2,15 @@
 // nothing.
 #pragma once
 
-#include "messaging/services/IAPPEventFilterCallBack.h"
-#include "messaging/services/IAPPEventFilterNotify.h"
-#include "messaging/services/IFileManagerControllerCallBack.h"
-#include "messaging/services/IFileManagerControllerNotify.h"
-#include "messaging/services/IMessageCenterCallBack.h"
-#include "messaging/services/IMessageCenterNotify.h"
-#include "messaging/services/IPowerManagerCallBack.h"
-#include "messaging/services/IPowerManagerNotify.h"
-#include "messaging/services/IProjectDataManagerCallBack.h"
-#include "messaging/services/IProjectDataManagerNotify.h"
-#include "messaging/services/IShowTitlerControllerCallBack.h"
-#include "messaging/services/ISoftKeyBoardControllerCallBack.h"
-#include "messaging/services/ISystemSetupManagerCallBack.h"
-#include "messaging/services/ISystemSetupManagerNotify.h"
+#include "messaging/services/IAPPEventFilter.h"
+#include "messaging/services/IFileManagerController.h"
+#include "messaging/services/IMessageCenter.h"
+#include "messaging/services/IPowerManager.h"
+#include "messaging/services/IProjectDataManager.h"
+#include "messaging/services/IShowTitlerController.h"
+#include "messaging/services/ISoftKeyBoardController.h"
+#include "messaging/services/ISystemSetupManager.h"
 #include "messaging/services/ITitler.h"
-#include "messaging/services/ITitlerCallBack.h"
 
 #include <memory>
 #include <numeric>

@@ -3,7 +3,6 @@
 #pragma once
 
 #include "messaging/services/ISoftKeyBoardController.h"
-#include "messaging/services/ISoftKeyBoardControllerCallBack.h"
 #include "messaging/services/SubCommonDefine.h"
 
 #include <QEvent>

@@ -20,6 +20,9 @@ public:
     virtual void addCBAdapter(IAdapterBase* adapter) = 0;
     // Deletes the callback adapter with that id.
     virtual void removeCBAdapter(long id) = 0;
+    // From here on recv drops its events where it would hold their sender up, and nobody waits in it. Any
+    // thread.
+    virtual void stopReceiving() {}
 };
 
 } // namespace PTC

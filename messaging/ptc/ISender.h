@@ -19,6 +19,9 @@ public:
     virtual bool isConnected() const { return true; }
     // As isConnected; a connection that was lost is begun anew, without waiting for it.
     virtual bool reconnect() { return isConnected(); }
+    // Begins a connection to the process with that client number without waiting for it, unless there is one.
+    // False when nobody listens there.
+    virtual bool beginConnect(long) { return isConnected(); }
     // Ends the sending: what still waits has until the deadline, and later calls are dropped.
     virtual void finish(std::chrono::steady_clock::time_point) {}
 };

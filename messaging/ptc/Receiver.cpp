@@ -58,8 +58,4 @@ void Receiver::handleEvent(Event* event)
     }
 }
 
-void Receiver::stopReceiving()
-{
-}
-
 } // namespace PTC

@@ -27,8 +27,6 @@ public:
 
     // Hands the event to its adapter; without one, nothing happens. The event stays the caller's.
     virtual void handleEvent(Event* event);
-    // From here on recv drops its events and nobody waits in it. Any thread.
-    virtual void stopReceiving();
 
 private:
     using AdapterMap = std::map<long, std::unique_ptr<IAdapterBase>>;

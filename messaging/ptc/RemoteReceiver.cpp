@@ -2,7 +2,7 @@
 
 #include "messaging/ptc/Event.h"
 #include "messaging/ptc/EventPacket.h"
-#include "messaging/ptc/Receiver.h"
+#include "messaging/ptc/IReceiver.h"
 
 namespace PTC
 {
@@ -55,9 +55,7 @@ void RemoteReceiver::stopReceivers()
 {
     const std::lock_guard<std::mutex> lock(m_mutex);
     for (const auto& [id, receiver] : m_receivers) {
-        if (auto* stoppable = dynamic_cast<Receiver*>(receiver.get())) {
-            stoppable->stopReceiving();
-        }
+        receiver->stopReceiving();
     }
 }
 

@@ -45,9 +45,7 @@ public:
     bool initialize(long identity) override;
     // 0 on success, -1 otherwise.
     int connectServer();
-    // Begins a connection without waiting for it, unless there is one to that client number. False when
-    // nobody listens there.
-    bool beginConnect(long identity);
+    bool beginConnect(long identity) override;
     // Milliseconds that a listener without room is waited for.
     void setConnectTimeout(int milliseconds);
 

@@ -1,6 +1,8 @@
 // Types of the touch lock announcements that the appliance's processes exchange.
 #pragma once
 
+#include "messaging/ptc/WireRecord.h"
+
 #include <QMetaType>
 
 namespace APPEventDefine
@@ -15,13 +17,14 @@ enum LOCKTYPE : int {
 // Who sent an event; 3 is this program, which ignores its own echo.
 enum EventRevicer : int { EVENTREVICER_NONE = 0, EVENTREVICER_TITLER = 3, EVENTREVICER_RESTORE_ALL = 4 };
 
-// Wire: client id (int32), lock type (int32), flag (bool as int), event receiver (int).
-struct _tagAPPEvent {
-    int clientId = -1;
-    int lockType = LOCKTYPE_NONE;
-    bool flag = false;
-    int eventReceiver = EVENTREVICER_NONE;
-};
+// clang-format off
+#define _tagAPPEvent_FIELDS(FIELD) \
+    FIELD(Int32, clientId, -1) \
+    FIELD(Int32, lockType, LOCKTYPE_NONE) \
+    FIELD(Flag, flag, false) \
+    FIELD(Int, eventReceiver, EVENTREVICER_NONE)
+// clang-format on
+WIRE_RECORD(_tagAPPEvent);
 using tagAPPEvent = _tagAPPEvent;
 
 } // namespace APPEventDefine

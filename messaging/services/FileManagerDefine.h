@@ -1,8 +1,9 @@
 // Types of the file manager service, which is told of changes to titles and tells of changes to files.
 #pragma once
 
+#include "messaging/ptc/WireRecord.h"
+
 #include <QMetaType>
-#include <string>
 
 namespace FileManagerDefine
 {
@@ -17,61 +18,61 @@ enum emTITLECHANGE_TYPE : int {
 // File types that this program looks at in notices; all others are of no interest to it.
 enum emFILE_TYPE : int { FILE_TYPE_FONT = 6, FILE_TYPE_TITLER_TEMPLATE = 8 };
 
-// Wire: client id (int32), path (wide), change type (int).
-struct tagTitleChangeStatusParam {
-    int clientId = -1;
-    std::wstring path;
-    int changeType = 0;
-};
+// clang-format off
 
-// Wire: client id (int32), path (wide). Of titlerEditStatus, titlerEditEndStatus, renameFolderStart and
-// updateTitlerOrder.
-struct tagTitlerPathParam {
-    int clientId = -1;
-    std::wstring path;
-};
+// A change to a title; changeType is an emTITLECHANGE_TYPE.
+#define tagTitleChangeStatusParam_FIELDS(FIELD) \
+    FIELD(Int32, clientId, -1) \
+    FIELD(Wide, path) \
+    FIELD(Int, changeType, 0)
 
-// Wire: client id (int32), old path (wide), new path (wide).
-struct tagChangeFolderNameParam {
-    int clientId = -1;
-    std::wstring oldPath;
-    std::wstring newPath;
-};
+#define tagTitlerPathParam_FIELDS(FIELD) \
+    FIELD(Int32, clientId, -1) \
+    FIELD(Wide, path)
 
-// Wire: file type, two ints, then four wide strings.
-struct tagRenameNotify {
-    int fileType = 0;
-    int second = 0;
-    int third = 0;
-    std::wstring strings[4];
-};
+#define tagChangeFolderNameParam_FIELDS(FIELD) \
+    FIELD(Int32, clientId, -1) \
+    FIELD(Wide, oldPath) \
+    FIELD(Wide, newPath)
 
-// Wire: file type, int, int, long, int, wide path, int, int, wide, wide, wide, int, bool, seven ints.
-struct tagImportNotify {
-    int fileType = 0;
-    int fileTypeHigh = 0; // compared together with fileType as one 64-bit value
-    int third = 0;
-    long fourth = 0;
-    int fifth = 0;
-    std::wstring path;
-    int seventh = 0;
-    int eighth = 0;
-    std::wstring strings[3];
-    int twelfth = 0;
-    bool thirteenth = false;
-    int last[7] = {};
-};
+#define tagRenameNotify_FIELDS(FIELD) \
+    FIELD(Int, fileType, 0) \
+    FIELD(Int, second, 0) \
+    FIELD(Int, third, 0) \
+    FIELD(FourWide, strings)
 
-// Wire: int, file type, result, wide path, int, long, int.
-struct tagDeleteNotify {
-    int first = 0;
-    int fileType = 0;
-    int result = 0;
-    std::wstring path;
-    int fifth = 0;
-    long sixth = 0;
-    int seventh = 0;
-};
+// fileType and fileTypeHigh are the two halves of one 64-bit value.
+#define tagImportNotify_FIELDS(FIELD) \
+    FIELD(Int, fileType, 0) \
+    FIELD(Int, fileTypeHigh, 0) \
+    FIELD(Int, third, 0) \
+    FIELD(Long, fourth, 0) \
+    FIELD(Int, fifth, 0) \
+    FIELD(Wide, path) \
+    FIELD(Int, seventh, 0) \
+    FIELD(Int, eighth, 0) \
+    FIELD(ThreeWide, strings) \
+    FIELD(Int, twelfth, 0) \
+    FIELD(Bool, thirteenth, false) \
+    FIELD(SevenInt, last)
+
+// result is 0 when the file was deleted.
+#define tagDeleteNotify_FIELDS(FIELD) \
+    FIELD(Int, first, 0) \
+    FIELD(Int, fileType, 0) \
+    FIELD(Int, result, 0) \
+    FIELD(Wide, path) \
+    FIELD(Int, fifth, 0) \
+    FIELD(Long, sixth, 0) \
+    FIELD(Int, seventh, 0)
+
+// clang-format on
+WIRE_RECORD(tagTitleChangeStatusParam);
+WIRE_RECORD(tagTitlerPathParam);
+WIRE_RECORD(tagChangeFolderNameParam);
+WIRE_RECORD(tagRenameNotify);
+WIRE_RECORD(tagImportNotify);
+WIRE_RECORD(tagDeleteNotify);
 
 } // namespace FileManagerDefine
 

@@ -1,24 +1,32 @@
 // The service that announces touch locks to the other processes.
-//
-// Calls are one-way and run in the caller's thread; answers come as calls on IAPPEventFilterCallBack,
-// events as calls on IAPPEventFilterNotify. Targets stay the caller's.
 #pragma once
 
 #include "messaging/services/APPEventDefine.h"
+#include "messaging/services/ServiceInterface.h"
 
 class IAPPEventFilterCallBack;
-struct _tagAPPEventFilterNotify;
+class IAPPEventFilterNotify;
+using _tagAPPEventFilterNotify = NotifyTarget<IAPPEventFilterNotify>;
 
-class IAPPEventFilter
-{
-public:
-    virtual ~IAPPEventFilter() = default;
+// clang-format off
+#define APPEventFilter_CALLS(CALL) \
+    CALL(1, postAPPEventFilter, APPEventDefine::_tagAPPEvent, event) \
+    CALL(2, postRestoreOriginal, APPEventDefine::_tagAPPEvent, event) \
+    CALL(3, postRestoreFocus) \
+    CALL(4, unregisterCallBack, int, clientId) \
+    CALL(5, unregisterNotify, int, clientId) \
+    CALL(6, registerCallBack, IAPPEventFilterCallBack*, target) \
+    CALL(7, registerNotify, _tagAPPEventFilterNotify, notify)
 
-    virtual void postAPPEventFilter(APPEventDefine::_tagAPPEvent event) = 0;
-    virtual void postRestoreOriginal(APPEventDefine::_tagAPPEvent event) = 0;
-    virtual void postRestoreFocus() = 0;
-    virtual void unregisterCallBack(int clientId) = 0;
-    virtual void unregisterNotify(int clientId) = 0;
-    virtual void registerCallBack(IAPPEventFilterCallBack* target) = 0;
-    virtual void registerNotify(_tagAPPEventFilterNotify notify) = 0;
-};
+#define APPEventFilter_ANSWERS(ANSWER) \
+    ANSWER(1, setClientID, int, clientId)
+
+#define APPEventFilter_EVENTS(NOTIFY) \
+    NOTIFY(1, postAPPEventFilterNotify, APPEventDefine::_tagAPPEvent, event) \
+    NOTIFY(2, postRestoreOriginalNotify, APPEventDefine::_tagAPPEvent, event) \
+    NOTIFY(3, postRestoreFocusNotify)
+// clang-format on
+
+SERVICE(APPEventFilter, 1, MAIN_CLIENT, 7, 2, 3);
+SERVICE_ANSWERS(APPEventFilter);
+SERVICE_EVENTS(APPEventFilter);

@@ -1,26 +1,36 @@
 // The service that shows the numbered message boxes.
-//
-// Calls are one-way and run in the caller's thread; answers come as calls on IMessageCenterCallBack,
-// events as calls on IMessageCenterNotify. Targets stay the caller's.
 #pragma once
 
 #include "messaging/services/MessageDefine.h"
+#include "messaging/services/ServiceInterface.h"
 
 class IMessageCenterCallBack;
-struct _tagMessageCenterNotify;
+class IMessageCenterNotify;
+using _tagMessageCenterNotify = NotifyTarget<IMessageCenterNotify>;
 
-class IMessageCenter
-{
-public:
-    virtual ~IMessageCenter() = default;
+// clang-format off
+#define MessageCenter_CALLS(CALL) \
+    CALL(1, setTopWindow, MessageDefine::_tagTopWindowParam, window) \
+    CALL(2, getTopWindow, int, clientId) \
+    CALL(3, postMessage, MessageDefine::_tagMessageParam, message) \
+    CALL(4, closeMessage, MessageDefine::_tagCloseParam, box) \
+    CALL(5, showBar, int, bar) \
+    CALL(6, unregisterCallBack, int, clientId) \
+    CALL(7, unregisterNotify, int, clientId) \
+    CALL(8, registerCallBack, IMessageCenterCallBack*, target) \
+    CALL(9, registerNotify, _tagMessageCenterNotify, notify)
 
-    virtual void setTopWindow(MessageDefine::_tagTopWindowParam param) = 0;
-    virtual void getTopWindow(int clientId) = 0;
-    virtual void postMessage(MessageDefine::_tagMessageParam param) = 0;
-    virtual void closeMessage(MessageDefine::_tagCloseParam param) = 0;
-    virtual void showBar(int bar) = 0;
-    virtual void unregisterCallBack(int clientId) = 0;
-    virtual void unregisterNotify(int clientId) = 0;
-    virtual void registerCallBack(IMessageCenterCallBack* target) = 0;
-    virtual void registerNotify(_tagMessageCenterNotify notify) = 0;
-};
+#define MessageCenter_ANSWERS(ANSWER) \
+    ANSWER(1, setClientID, int, clientId) \
+    ANSWER(2, getTopWindowCallBack, int, topWindow)
+
+#define MessageCenter_EVENTS(NOTIFY) \
+    NOTIFY(1, getTopWindowNotify, int, topWindow) \
+    NOTIFY(2, postMessageNotify, MessageDefine::_tagMessageParam, message) \
+    NOTIFY(3, closeMessageNotify, MessageDefine::_tagCloseParam, box) \
+    NOTIFY(4, showBarNotify, int, bar)
+// clang-format on
+
+SERVICE(MessageCenter, 65, MAIN_CLIENT, 9, 66, 67);
+SERVICE_ANSWERS(MessageCenter);
+SERVICE_EVENTS(MessageCenter);

@@ -1,23 +1,31 @@
-// The service that tells when the appliance goes down or comes up.
-//
-// Calls are one-way and run in the caller's thread; answers come as calls on IPowerManagerCallBack,
-// events as calls on IPowerManagerNotify. Targets stay the caller's.
+// The service that reports when the appliance goes down or comes up.
 #pragma once
 
+#include "messaging/services/ServiceInterface.h"
+
 class IPowerManagerCallBack;
-struct _tagPowerManagerNotify;
+class IPowerManagerNotify;
+using _tagPowerManagerNotify = NotifyTarget<IPowerManagerNotify>;
 
-class IPowerManager
-{
-public:
-    virtual ~IPowerManager() = default;
+// clang-format off
+#define PowerManager_CALLS(CALL) \
+    CALL(1, closeClient, int, clientId) \
+    CALL(2, unregisterCallBack, int, clientId) \
+    CALL(3, unregisterNotify, int, clientId) \
+    CALL(4, inProcessing) \
+    CALL(5, powerOff) \
+    CALL(6, willPowerOff) \
+    CALL(7, registerCallBack, IPowerManagerCallBack*, target) \
+    CALL(8, registerNotify, _tagPowerManagerNotify, notify)
 
-    virtual void closeClient(int clientId) = 0;
-    virtual void unregisterCallBack(int clientId) = 0;
-    virtual void unregisterNotify(int clientId) = 0;
-    virtual void inProcessing() = 0;
-    virtual void powerOff() = 0;
-    virtual void willPowerOff() = 0;
-    virtual void registerCallBack(IPowerManagerCallBack* target) = 0;
-    virtual void registerNotify(_tagPowerManagerNotify notify) = 0;
-};
+#define PowerManager_ANSWERS(ANSWER) \
+    ANSWER(1, getClientID, int, clientId)
+
+#define PowerManager_EVENTS(NOTIFY) \
+    NOTIFY(1, powerOff) \
+    NOTIFY(2, powerOn)
+// clang-format on
+
+SERVICE(PowerManager, 71, MAIN_CLIENT, 8, 72, 73);
+SERVICE_ANSWERS(PowerManager);
+SERVICE_EVENTS(PowerManager);

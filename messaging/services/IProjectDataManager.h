@@ -1,19 +1,26 @@
-// The service that tells when a project is loaded.
-//
-// Calls are one-way and run in the caller's thread; answers come as calls on IProjectDataManagerCallBack,
-// events as calls on IProjectDataManagerNotify. Targets stay the caller's.
+// The service that reports when a project is loaded.
 #pragma once
 
+#include "messaging/services/ServiceInterface.h"
+
 class IProjectDataManagerCallBack;
-struct _tagProjectDataManagerNotify;
+class IProjectDataManagerNotify;
+using _tagProjectDataManagerNotify = NotifyTarget<IProjectDataManagerNotify>;
 
-class IProjectDataManager
-{
-public:
-    virtual ~IProjectDataManager() = default;
+// clang-format off
+#define ProjectDataManager_CALLS(CALL) \
+    CALL(7, unregisterCallBack, int, clientId) \
+    CALL(8, unregisterNotifyCallBack, int, clientId) \
+    CALL(9, registerCallBack, IProjectDataManagerCallBack*, target) \
+    CALL(10, registerNotifyCallBack, _tagProjectDataManagerNotify, notify)
 
-    virtual void unregisterCallBack(int clientId) = 0;
-    virtual void unregisterNotifyCallBack(int clientId) = 0;
-    virtual void registerCallBack(IProjectDataManagerCallBack* target) = 0;
-    virtual void registerNotifyCallBack(_tagProjectDataManagerNotify notify) = 0;
-};
+#define ProjectDataManager_ANSWERS(ANSWER) \
+    ANSWER(1, getClientID, int, clientId)
+
+#define ProjectDataManager_EVENTS(NOTIFY) \
+    NOTIFY(1, loadNotify, int, state)
+// clang-format on
+
+SERVICE(ProjectDataManager, 76, MAIN_CLIENT, 10, 77, 78);
+SERVICE_ANSWERS(ProjectDataManager);
+SERVICE_EVENTS(ProjectDataManager);

@@ -1,18 +1,19 @@
-// The service that of the sub panel process asks for the titler.
-//
-// Calls are one-way and run in the caller's thread; answers come as calls on IShowTitlerControllerCallBack.
-// Targets stay the caller's.
+// The service through which the sub panel process asks for the titler.
 #pragma once
 
+#include "messaging/services/ServiceInterface.h"
 #include "messaging/services/SubCommonDefine.h"
 
 class IShowTitlerControllerCallBack;
 
-class IShowTitlerController
-{
-public:
-    virtual ~IShowTitlerController() = default;
+// clang-format off
+#define ShowTitlerController_CALLS(CALL) \
+    CALL(1, setFolderStatus, SubCommonDefine::tagFOLDER_TYPE, folder) \
+    CALL(2, registerCallBack, IShowTitlerControllerCallBack*, target)
 
-    virtual void setFolderStatus(SubCommonDefine::tagFOLDER_TYPE folder) = 0;
-    virtual void registerCallBack(IShowTitlerControllerCallBack* target) = 0;
-};
+#define ShowTitlerController_ANSWERS(ANSWER) \
+    ANSWER(1, showTitler)
+// clang-format on
+
+SERVICE(ShowTitlerController, 92, SUB_PANEL_CLIENT, 2, 93, ServiceTable::NO_ADAPTER);
+SERVICE_ANSWERS(ShowTitlerController);

@@ -1,28 +1,32 @@
 // The service that shows the soft keyboard and sends what is typed on it.
-//
-// Calls are one-way and run in the caller's thread; answers come as calls on ISoftKeyBoardControllerCallBack.
-// Targets stay the caller's.
 #pragma once
 
+#include "messaging/services/ServiceInterface.h"
 #include "messaging/services/SubCommonDefine.h"
 
 class ISoftKeyBoardControllerCallBack;
 
-class ISoftKeyBoardController
-{
-public:
-    virtual ~ISoftKeyBoardController() = default;
+// clang-format off
+#define SoftKeyBoardController_CALLS(CALL) \
+    CALL(1, show, SubCommonDefine::tagSoftKeyBoardInitData, data) \
+    CALL(2, close) \
+    CALL(3, dummyClose) \
+    CALL(4, simpleClose) \
+    CALL(5, sendKey, SubCommonDefine::tagSoftKeyBoardKeyData, key) \
+    CALL(6, sendLimitInfo, SubCommonDefine::taLimitInfo, info) \
+    CALL(7, closeLimitBalloon) \
+    CALL(8, showMask) \
+    CALL(9, hideMask) \
+    CALL(10, registerCallBack, ISoftKeyBoardControllerCallBack*, target)
 
-    virtual void show(SubCommonDefine::tagSoftKeyBoardInitData data) = 0;
-    virtual void close() = 0;
-    virtual void dummyClose() = 0;
-    virtual void simpleClose() = 0;
-    virtual void sendKey(SubCommonDefine::tagSoftKeyBoardKeyData key) = 0;
-    virtual void sendLimitInfo(SubCommonDefine::taLimitInfo info) = 0;
-    virtual void closeLimitBalloon() = 0;
-    virtual void registerCallBack(ISoftKeyBoardControllerCallBack* target) = 0;
-    virtual void showMask() = 0;
-    virtual void hideMask() = 0;
-    // False when the service is known to be gone: what is sent to it now is lost.
-    virtual bool isReachable() const { return true; }
-};
+#define SoftKeyBoardController_ANSWERS(ANSWER) \
+    ANSWER(1, sendInputString, std::wstring, text) \
+    ANSWER(2, sendInputStringOnEnterPressing, std::wstring, text) \
+    ANSWER(3, sendInputStringOnTextChanged, std::wstring, text) \
+    ANSWER(4, sendKey, SubCommonDefine::tagSoftKeyBoardKeyData, key) \
+    ANSWER(5, sendInputStringSelectionPos, SubCommonDefine::tagSoftKeyBoardKeyTextSelectionPos, position) \
+    ANSWER(6, sendSoftKeyboardState, bool, shown)
+// clang-format on
+
+SERVICE(SoftKeyBoardController, 95, SUB_PANEL_CLIENT, 10, 96, ServiceTable::NO_ADAPTER);
+SERVICE_ANSWERS(SoftKeyBoardController);

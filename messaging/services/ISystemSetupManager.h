@@ -1,21 +1,32 @@
 // The service that knows the appliance's languages and model.
-//
-// Calls are one-way and run in the caller's thread; answers come as calls on ISystemSetupManagerCallBack,
-// events as calls on ISystemSetupManagerNotify. Targets stay the caller's.
 #pragma once
 
+#include "messaging/services/ServiceInterface.h"
+#include "messaging/services/SystemSetupDef.h"
+
 class ISystemSetupManagerCallBack;
-struct _tagSystemSetupManagerNotify;
+class ISystemSetupManagerNotify;
+using _tagSystemSetupManagerNotify = NotifyTarget<ISystemSetupManagerNotify>;
 
-class ISystemSetupManager
-{
-public:
-    virtual ~ISystemSetupManager() = default;
+// clang-format off
+#define SystemSetupManager_CALLS(CALL) \
+    CALL(1, getLanguageInfo, int, clientId) \
+    CALL(16, getInformation, int, clientId) \
+    CALL(62, unregisterCallBack, int, clientId) \
+    CALL(63, unregisterNotifyCallBack, int, clientId) \
+    CALL(64, registerCallBack, ISystemSetupManagerCallBack*, target) \
+    CALL(65, registerNotifyCallBack, _tagSystemSetupManagerNotify, notify)
 
-    virtual void getLanguageInfo(int clientId) = 0;
-    virtual void getInformation(int clientId) = 0;
-    virtual void unregisterCallBack(int clientId) = 0;
-    virtual void unregisterNotifyCallBack(int clientId) = 0;
-    virtual void registerCallBack(ISystemSetupManagerCallBack* target) = 0;
-    virtual void registerNotifyCallBack(_tagSystemSetupManagerNotify notify) = 0;
-};
+#define SystemSetupManager_ANSWERS(ANSWER) \
+    ANSWER(1, getClientID, int, clientId) \
+    ANSWER(2, getLanguageInfoCallBack, SystemSetupDef::tagSystemLanguageParam, language) \
+    ANSWER(3, getInformationCallBack, SystemSetupDef::tagSystemInformation, information)
+
+#define SystemSetupManager_EVENTS(NOTIFY) \
+    NOTIFY(1, setSystemLanguageNotify, int, systemLanguage) \
+    NOTIFY(2, setInputLanguageNotify, int, inputLanguage)
+// clang-format on
+
+SERVICE(SystemSetupManager, 114, MAIN_CLIENT, 65, 115, 116);
+SERVICE_ANSWERS(SystemSetupManager);
+SERVICE_EVENTS(SystemSetupManager);

@@ -1,19 +1,25 @@
-// The service that this program offers to its siblings. Called in the GUI thread.
+// The service that this program offers to its siblings.
+//
+// registerCallBack sends results there from now on; the implementation takes the callback over. The data of a
+// result is valid during the call only.
 #pragma once
 
+#include "messaging/services/ServiceInterface.h"
 #include "messaging/services/TitlerDefine.h"
 
 class ITitlerCallBack;
 
-class ITitler
-{
-public:
-    virtual ~ITitler() = default;
+// clang-format off
+#define Titler_CALLS(CALL) \
+    CALL(1, showTitlerCreate, _CALL_TITLER_TYPE, type) \
+    CALL(2, showTitlerEdit, _SHOW_TITLER_PARAMTER, title) \
+    CALL(3, showDialogMaskWidget, bool, show) \
+    CALL(4, showMessageMaskWidget, bool, show) \
+    CALL(5, registerCallBack, ITitlerCallBack*, callBack)
 
-    // Where results go from now on; the callback is handed over.
-    virtual void registerCallBack(ITitlerCallBack* callBack) = 0;
-    virtual void showTitlerCreate(_CALL_TITLER_TYPE type) = 0;
-    virtual void showTitlerEdit(_SHOW_TITLER_PARAMTER param) = 0;
-    virtual void showDialogMaskWidget(bool show) = 0;
-    virtual void showMessageMaskWidget(bool show) = 0;
-};
+#define Titler_ANSWERS(ANSWER) \
+    ANSWER(1, finishTitlerCreateCallback, _CALLBACK_TITLER_PARAMTER, result)
+// clang-format on
+
+SERVICE(Titler, 117, TITLER_CLIENT, 5, 118, ServiceTable::NO_ADAPTER);
+SERVICE_ANSWERS(Titler);

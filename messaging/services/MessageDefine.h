@@ -1,8 +1,9 @@
 // Types of the message service, which shows the numbered message boxes of the appliance.
 #pragma once
 
+#include "messaging/ptc/WireRecord.h"
+
 #include <QMetaType>
-#include <string>
 
 namespace MessageDef
 {
@@ -38,28 +39,29 @@ enum _emCloseType : int { CLOSE_CANCEL = 1, CLOSE_OK = 2 };
 // Who is in front of the operator.
 enum _emTopWindow : int { TOP_WINDOW_TITLER = 1, TOP_WINDOW_MAIN = 2 };
 
-// Wire: client id, top window; ints.
-struct _tagTopWindowParam {
-    int clientId = -1;
-    int topWindow = 0;
-};
+// clang-format off
 
-// Wire: client id, box kind, box type (ints), first string, text (wide), message id (int).
-struct _tagMessageParam {
-    int clientId = -1;
-    int boxKind = 2;
-    int boxType = -1;
-    std::wstring first;
-    std::wstring text;
-    int messageId = 0;
-};
+#define _tagTopWindowParam_FIELDS(FIELD) \
+    FIELD(Int, clientId, -1) \
+    FIELD(Int, topWindow, 0)
 
-// Wire: client id, close type, message id; ints.
-struct _tagCloseParam {
-    int clientId = -1;
-    int closeType = 0;
-    int messageId = 0;
-};
+#define _tagMessageParam_FIELDS(FIELD) \
+    FIELD(Int, clientId, -1) \
+    FIELD(Int, boxKind, 2) \
+    FIELD(Int, boxType, -1) \
+    FIELD(Wide, first) \
+    FIELD(Wide, text) \
+    FIELD(Int, messageId, 0)
+
+#define _tagCloseParam_FIELDS(FIELD) \
+    FIELD(Int, clientId, -1) \
+    FIELD(Int, closeType, 0) \
+    FIELD(Int, messageId, 0)
+
+// clang-format on
+WIRE_RECORD(_tagTopWindowParam);
+WIRE_RECORD(_tagMessageParam);
+WIRE_RECORD(_tagCloseParam);
 using tagCloseParam = _tagCloseParam;
 
 } // namespace MessageDefine

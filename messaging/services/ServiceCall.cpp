@@ -2,7 +2,6 @@
 
 #include "messaging/ptc/CallbackProxy.h"
 #include "messaging/ptc/Proxy.h"
-#include "messaging/services/RecordPacking.h"
 
 namespace ServiceCall
 {

@@ -1,102 +1,77 @@
 #include "messaging/services/ServiceFamilies.h"
 
-#include "messaging/services/APPEventFilterCallBackAdapter.h"
-#include "messaging/services/APPEventFilterNotifyAdapter.h"
-#include "messaging/services/APPEventFilterRemoteProxy.h"
-#include "messaging/services/FileManagerControllerCallBackAdapter.h"
-#include "messaging/services/FileManagerControllerNotifyAdapter.h"
-#include "messaging/services/FileManagerControllerRemoteProxy.h"
-#include "messaging/services/MessageCenterCallBackAdapter.h"
-#include "messaging/services/MessageCenterNotifyAdapter.h"
-#include "messaging/services/MessageCenterRemoteProxy.h"
-#include "messaging/services/PowerManagerCallBackAdapter.h"
-#include "messaging/services/PowerManagerNotifyAdapter.h"
-#include "messaging/services/PowerManagerRemoteProxy.h"
-#include "messaging/services/ProjectDataManagerCallBackAdapter.h"
-#include "messaging/services/ProjectDataManagerNotifyAdapter.h"
-#include "messaging/services/ProjectDataManagerRemoteProxy.h"
-#include "messaging/services/ShowTitlerControllerCallBackAdapter.h"
-#include "messaging/services/ShowTitlerControllerRemoteProxy.h"
-#include "messaging/services/SoftKeyBoardControllerCallBackAdapter.h"
-#include "messaging/services/SoftKeyBoardControllerRemoteProxy.h"
-#include "messaging/services/SystemSetupManagerCallBackAdapter.h"
-#include "messaging/services/SystemSetupManagerNotifyAdapter.h"
-#include "messaging/services/SystemSetupManagerRemoteProxy.h"
-
 namespace ServiceFamilies
 {
 
 namespace
 {
 
-template <typename RemoteProxy, typename Interface>
-PTC::Proxy* make(long interfaceId, void** instance)
+template <typename... Types>
+struct TypeList {
+};
+
+using Proxies =
+    TypeList<APPEventFilterRemoteProxy, FileManagerControllerRemoteProxy, MessageCenterRemoteProxy,
+             PowerManagerRemoteProxy, ProjectDataManagerRemoteProxy, ShowTitlerControllerRemoteProxy,
+             SoftKeyBoardControllerRemoteProxy, SystemSetupManagerRemoteProxy>;
+
+using Adapters =
+    TypeList<APPEventFilterCallBackAdapter, APPEventFilterNotifyAdapter, FileManagerControllerCallBackAdapter,
+             FileManagerControllerNotifyAdapter, MessageCenterCallBackAdapter, MessageCenterNotifyAdapter,
+             PowerManagerCallBackAdapter, PowerManagerNotifyAdapter, ProjectDataManagerCallBackAdapter,
+             ProjectDataManagerNotifyAdapter, ShowTitlerControllerCallBackAdapter,
+             SoftKeyBoardControllerCallBackAdapter, SystemSetupManagerCallBackAdapter,
+             SystemSetupManagerNotifyAdapter>;
+
+template <typename RemoteProxy>
+PTC::Proxy* makeProxy(void** instance)
 {
-    auto* proxy = new RemoteProxy(interfaceId);
-    *instance = static_cast<Interface*>(proxy);
+    auto* proxy = new RemoteProxy(RemoteProxy::INTERFACE_ID);
+    *instance = static_cast<typename RemoteProxy::Interface*>(proxy);
     return proxy;
+}
+
+template <typename... RemoteProxies>
+PTC::Proxy* makeProxyOf(TypeList<RemoteProxies...>, long interfaceId, void** instance)
+{
+    PTC::Proxy* made = nullptr;
+    static_cast<void>(
+        ((RemoteProxies::INTERFACE_ID == interfaceId && (made = makeProxy<RemoteProxies>(instance))) || ...));
+    return made;
+}
+
+template <typename... Types>
+PTC::IAdapterBase* makeAdapterOf(TypeList<Types...>, long adapterType, long id)
+{
+    PTC::IAdapterBase* made = nullptr;
+    static_cast<void>(((Types::Interface::ADAPTER_TYPE == adapterType && (made = new Types(id))) || ...));
+    return made;
+}
+
+template <typename... Types>
+PTC::CallbackProxy* makeClientProxyOf(TypeList<Types...>, long adapterType, long id)
+{
+    PTC::CallbackProxy* made = nullptr;
+    static_cast<void>(
+        ((Types::Interface::ADAPTER_TYPE == adapterType && (made = new typename Types::Peer(id))) || ...));
+    return made;
 }
 
 } // namespace
 
 PTC::Proxy* createProxy(long interfaceId, void** instance)
 {
-    switch (interfaceId) {
-    case APPEventFilterRemoteProxy::INTERFACE_ID:
-        return make<APPEventFilterRemoteProxy, IAPPEventFilter>(interfaceId, instance);
-    case FileManagerControllerRemoteProxy::INTERFACE_ID:
-        return make<FileManagerControllerRemoteProxy, IFileManagerController>(interfaceId, instance);
-    case MessageCenterRemoteProxy::INTERFACE_ID:
-        return make<MessageCenterRemoteProxy, IMessageCenter>(interfaceId, instance);
-    case PowerManagerRemoteProxy::INTERFACE_ID:
-        return make<PowerManagerRemoteProxy, IPowerManager>(interfaceId, instance);
-    case ProjectDataManagerRemoteProxy::INTERFACE_ID:
-        return make<ProjectDataManagerRemoteProxy, IProjectDataManager>(interfaceId, instance);
-    case ShowTitlerControllerRemoteProxy::INTERFACE_ID:
-        return make<ShowTitlerControllerRemoteProxy, IShowTitlerController>(interfaceId, instance);
-    case SoftKeyBoardControllerRemoteProxy::INTERFACE_ID:
-        return make<SoftKeyBoardControllerRemoteProxy, ISoftKeyBoardController>(interfaceId, instance);
-    case SystemSetupManagerRemoteProxy::INTERFACE_ID:
-        return make<SystemSetupManagerRemoteProxy, ISystemSetupManager>(interfaceId, instance);
-    default:
-        return nullptr;
-    }
+    return makeProxyOf(Proxies(), interfaceId, instance);
 }
 
 PTC::IAdapterBase* createAdapter(long adapterType, long id)
 {
-    switch (adapterType) {
-    case APPEventFilterRemoteProxy::CALLBACK_ADAPTER_TYPE:
-        return new APPEventFilterCallBackAdapter(id);
-    case APPEventFilterRemoteProxy::NOTIFY_ADAPTER_TYPE:
-        return new APPEventFilterNotifyAdapter(id);
-    case FileManagerControllerRemoteProxy::CALLBACK_ADAPTER_TYPE:
-        return new FileManagerControllerCallBackAdapter(id);
-    case FileManagerControllerRemoteProxy::NOTIFY_ADAPTER_TYPE:
-        return new FileManagerControllerNotifyAdapter(id);
-    case MessageCenterRemoteProxy::CALLBACK_ADAPTER_TYPE:
-        return new MessageCenterCallBackAdapter(id);
-    case MessageCenterRemoteProxy::NOTIFY_ADAPTER_TYPE:
-        return new MessageCenterNotifyAdapter(id);
-    case PowerManagerRemoteProxy::CALLBACK_ADAPTER_TYPE:
-        return new PowerManagerCallBackAdapter(id);
-    case PowerManagerRemoteProxy::NOTIFY_ADAPTER_TYPE:
-        return new PowerManagerNotifyAdapter(id);
-    case ProjectDataManagerRemoteProxy::CALLBACK_ADAPTER_TYPE:
-        return new ProjectDataManagerCallBackAdapter(id);
-    case ProjectDataManagerRemoteProxy::NOTIFY_ADAPTER_TYPE:
-        return new ProjectDataManagerNotifyAdapter(id);
-    case ShowTitlerControllerRemoteProxy::CALLBACK_ADAPTER_TYPE:
-        return new ShowTitlerControllerCallBackAdapter(id);
-    case SoftKeyBoardControllerRemoteProxy::CALLBACK_ADAPTER_TYPE:
-        return new SoftKeyBoardControllerCallBackAdapter(id);
-    case SystemSetupManagerRemoteProxy::CALLBACK_ADAPTER_TYPE:
-        return new SystemSetupManagerCallBackAdapter(id);
-    case SystemSetupManagerRemoteProxy::NOTIFY_ADAPTER_TYPE:
-        return new SystemSetupManagerNotifyAdapter(id);
-    default:
-        return nullptr;
-    }
+    return makeAdapterOf(Adapters(), adapterType, id);
+}
+
+PTC::CallbackProxy* createClientProxy(long adapterType, long id)
+{
+    return makeClientProxyOf(Adapters(), adapterType, id);
 }
 
 } // namespace ServiceFamilies

@@ -1,5 +1,14 @@
 #include "messaging/services/ServiceTable.h"
 
+#include "messaging/services/IAPPEventFilter.h"
+#include "messaging/services/IFileManagerController.h"
+#include "messaging/services/IMessageCenter.h"
+#include "messaging/services/IPowerManager.h"
+#include "messaging/services/IProjectDataManager.h"
+#include "messaging/services/IShowTitlerController.h"
+#include "messaging/services/ISoftKeyBoardController.h"
+#include "messaging/services/ISystemSetupManager.h"
+
 #include <algorithm>
 #include <array>
 
@@ -9,9 +18,25 @@ namespace ServiceTable
 namespace
 {
 
+// By client number, from MAIN_CLIENT on.
+constexpr std::array<long, 9> SENDER_KEYS = {1, 2, 3, 4, 5, 6, 4, 7, 8};
+
+template <typename Interface>
+constexpr Service describe()
+{
+    return {Interface::INTERFACE_ID,
+            Interface::NAME,
+            SENDER_KEYS[Interface::CLIENT - MAIN_CLIENT],
+            Interface::CLIENT,
+            Interface::OPERATIONS,
+            Interface::CALLBACK_ADAPTER_TYPE,
+            Interface::NOTIFY_ADAPTER_TYPE};
+}
+
+// The services that this program calls are described by their own tables.
 // clang-format off
-const std::array SERVICES = {
-    Service{1, "APPEventFilter", MAIN_CLIENT_KEY, MAIN_CLIENT, 7, 2, 3},
+constexpr std::array SERVICES = {
+    describe<IAPPEventFilter>(),
     Service{4, "AudioAccessController", MAIN_CLIENT_KEY, MAIN_CLIENT, 27, 5, 6},
     Service{7, "AudioInputListController", MAIN_CLIENT_KEY, MAIN_CLIENT, 5, 8, NO_ADAPTER},
     Service{9, "AudioInstantStartController", MAIN_CLIENT_KEY, MAIN_CLIENT, 3, 10, NO_ADAPTER},
@@ -25,39 +50,36 @@ const std::array SERVICES = {
     Service{29, "CurrentStatusManager", MAIN_CLIENT_KEY, MAIN_CLIENT, 81, 30, NO_ADAPTER},
     Service{31, "EffectManager", MAIN_CLIENT_KEY, MAIN_CLIENT, 5, 32, NO_ADAPTER},
     Service{33, "EncodeParamManager", MAIN_CLIENT_KEY, MAIN_CLIENT, 8, 34, 35},
-    Service{36, "FileManagerController", MAIN_CLIENT_KEY, MAIN_CLIENT, 79, 37, 38},
+    describe<IFileManagerController>(),
     Service{41, "InputController", MAIN_CLIENT_KEY, MAIN_CLIENT, 6, 42, NO_ADAPTER},
     Service{43, "InputManager", MAIN_CLIENT_KEY, MAIN_CLIENT, 16, 44, 45},
     Service{46, "LogSender", MAIN_CLIENT_KEY, MAIN_CLIENT, 3, NO_ADAPTER, 47},
     Service{48, "LogoManager", MAIN_CLIENT_KEY, MAIN_CLIENT, 23, 49, 50},
     Service{53, "MediaFileManager", MAIN_CLIENT_KEY, MAIN_CLIENT, 22, 54, 55},
     Service{59, "MediaPlayController", MAIN_CLIENT_KEY, MAIN_CLIENT, 21, 60, 61},
-    Service{65, "MessageCenter", MAIN_CLIENT_KEY, MAIN_CLIENT, 9, 66, 67},
+    describe<IMessageCenter>(),
     Service{68, "NextVideoController", MAIN_CLIENT_KEY, MAIN_CLIENT, 51, 69, 70},
-    Service{71, "PowerManager", MAIN_CLIENT_KEY, MAIN_CLIENT, 8, 72, 73},
+    describe<IPowerManager>(),
     Service{74, "ProjectController", MAIN_CLIENT_KEY, MAIN_CLIENT, 5, 75, NO_ADAPTER},
-    Service{76, "ProjectDataManager", MAIN_CLIENT_KEY, MAIN_CLIENT, 10, 77, 78},
+    describe<IProjectDataManager>(),
     Service{79, "ProjectManager", MAIN_CLIENT_KEY, MAIN_CLIENT, 3, 80, NO_ADAPTER},
     Service{81, "RecordingController", MAIN_CLIENT_KEY, MAIN_CLIENT, 20, 82, 83},
     Service{87, "RemoteDeviceController", MAIN_CLIENT_KEY, MAIN_CLIENT, 13, 88, 89},
     Service{90, "SceneManager", MAIN_CLIENT_KEY, MAIN_CLIENT, 19, 91, NO_ADAPTER},
-    Service{92, "ShowTitlerController", SUB_PANEL_CLIENT_KEY, SUB_PANEL_CLIENT, 2, 93, NO_ADAPTER},
+    describe<IShowTitlerController>(),
     Service{94, "SnapShotController", MAIN_CLIENT_KEY, MAIN_CLIENT, 4, NO_ADAPTER, NO_ADAPTER},
-    Service{95, "SoftKeyBoardController", SUB_PANEL_CLIENT_KEY, SUB_PANEL_CLIENT, 10, 96, NO_ADAPTER},
+    describe<ISoftKeyBoardController>(),
     Service{97, "SourceManager", MAIN_CLIENT_KEY, MAIN_CLIENT, 8, 98, NO_ADAPTER},
     Service{99, "StreamingController", MAIN_CLIENT_KEY, MAIN_CLIENT, 12, 100, 101},
     Service{105, "StreamingManager", MAIN_CLIENT_KEY, MAIN_CLIENT, 11, 106, NO_ADAPTER},
     Service{110, "SubPanelController", SUB_PANEL_CLIENT_KEY, SUB_PANEL_CLIENT, 54, NO_ADAPTER, 111},
     Service{112, "SystemSettingManager", MAIN_CLIENT_KEY, MAIN_CLIENT, 2, 113, NO_ADAPTER},
-    Service{114, "SystemSetupManager", MAIN_CLIENT_KEY, MAIN_CLIENT, 65, 115, 116},
+    describe<ISystemSetupManager>(),
     Service{119, "TitlerManager", MAIN_CLIENT_KEY, MAIN_CLIENT, 28, 120, 121},
     Service{122, "TransManager", MAIN_CLIENT_KEY, MAIN_CLIENT, 6, 123, NO_ADAPTER},
     Service{124, "UpdateManager", MAIN_CLIENT_KEY, MAIN_CLIENT, 13, 125, 126},
 };
 // clang-format on
-
-// By client number, from MAIN_CLIENT on.
-constexpr std::array<long, 9> SENDER_KEYS = {1, 2, 3, 4, 5, 6, 4, 7, 8};
 
 bool isClient(long client)
 {

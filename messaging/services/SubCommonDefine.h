@@ -1,56 +1,59 @@
 // Types of the sub panel process: the folder status and the soft keyboard.
 #pragma once
 
-#include <string>
+#include "messaging/ptc/WireRecord.h"
 
 namespace SubCommonDefine
 {
 
-// Wire: type (int), path (wide).
-struct tagFOLDER_TYPE {
-    int type = 0;
-    std::wstring path;
-};
+// clang-format off
 
-// Describes a text field to the soft keyboard.
-// Wire: int32, wide, int32, int32, wide, int32, int32, int32, int32, wide, int32, in field order.
-struct tagSoftKeyBoardInitData {
-    int fieldKind = 0; // 1 for a line edit
-    std::wstring title;
-    int keyboardType = 0;
-    int maxLength = 100;
-    std::wstring text;
-    int textLength = 0;
-    int selectionStart = 0;
-    int selectionEnd = 0;
-    int selectionMode = 0;
-    std::wstring limitCondition; // pattern of the field's validator
-    int lastValue = 300;
-};
+#define tagFOLDER_TYPE_FIELDS(FIELD) \
+    FIELD(Int, type, 0) \
+    FIELD(Wide, path)
 
-// One key event. Wire: int32, int32, int32, wide, bool as int, int32, in field order.
-struct tagSoftKeyBoardKeyData {
-    int eventType = 0; // QEvent::Type; 1100 tells that the keyboard was closed
-    int key = 0;
-    int modifiers = 0;
-    std::wstring text;
-    bool autoRepeat = false;
-    int nativeVirtualKey = 0;
-};
+// Describes a text field to the soft keyboard. fieldKind is 1 for a line edit, limitCondition the pattern of
+// the field's validator.
+#define tagSoftKeyBoardInitData_FIELDS(FIELD) \
+    FIELD(Int32, fieldKind, 0) \
+    FIELD(Wide, title) \
+    FIELD(Int32, keyboardType, 0) \
+    FIELD(Int32, maxLength, 100) \
+    FIELD(Wide, text) \
+    FIELD(Int32, textLength, 0) \
+    FIELD(Int32, selectionStart, 0) \
+    FIELD(Int32, selectionEnd, 0) \
+    FIELD(Int32, selectionMode, 0) \
+    FIELD(Wide, limitCondition) \
+    FIELD(Int32, lastValue, 300)
 
-// Wire: four int32. Mode 0 puts the cursor at current, 1 selects begin to end, 2 selects all.
-struct tagSoftKeyBoardKeyTextSelectionPos {
-    int begin = 0;
-    int end = 0;
-    int current = 0;
-    int mode = 0;
-};
+// One key event. eventType is a QEvent::Type, or 1100 when the keyboard was closed.
+#define tagSoftKeyBoardKeyData_FIELDS(FIELD) \
+    FIELD(Int32, eventType, 0) \
+    FIELD(Int32, key, 0) \
+    FIELD(Int32, modifiers, 0) \
+    FIELD(Wide, text) \
+    FIELD(Flag, autoRepeat, false) \
+    FIELD(Int32, nativeVirtualKey, 0)
 
-// Why an input is refused. Wire: wide, wide, int.
-struct taLimitInfo {
-    std::wstring text;
-    std::wstring secondText;
-    int code = 0;
-};
+// Mode 0 puts the cursor at current, 1 selects begin to end, 2 selects all.
+#define tagSoftKeyBoardKeyTextSelectionPos_FIELDS(FIELD) \
+    FIELD(Int32, begin, 0) \
+    FIELD(Int32, end, 0) \
+    FIELD(Int32, current, 0) \
+    FIELD(Int32, mode, 0)
+
+// Why an input is refused.
+#define taLimitInfo_FIELDS(FIELD) \
+    FIELD(Wide, text) \
+    FIELD(Wide, secondText) \
+    FIELD(Int, code, 0)
+
+// clang-format on
+WIRE_RECORD(tagFOLDER_TYPE);
+WIRE_RECORD(tagSoftKeyBoardInitData);
+WIRE_RECORD(tagSoftKeyBoardKeyData);
+WIRE_RECORD(tagSoftKeyBoardKeyTextSelectionPos);
+WIRE_RECORD(taLimitInfo);
 
 } // namespace SubCommonDefine

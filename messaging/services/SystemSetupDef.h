@@ -1,6 +1,8 @@
 // Types of the system set-up service: languages and model of the appliance.
 #pragma once
 
+#include "messaging/ptc/WireRecord.h"
+
 #include <QMetaType>
 
 namespace SystemSetupDef
@@ -29,17 +31,19 @@ enum emInformationModel : int {
     emInformationModelChina = 1,
 };
 
-// First field, system language, input language; three ints on the wire, in this order.
-struct tagSystemLanguageParam {
-    int first = -1;
-    int systemLanguage = 0;
-    int inputLanguage = 0;
-};
+// clang-format off
 
-// One int on the wire.
-struct tagSystemInformation {
-    int model = 0;
-};
+#define tagSystemLanguageParam_FIELDS(FIELD) \
+    FIELD(Int, first, -1) \
+    FIELD(Int, systemLanguage, 0) \
+    FIELD(Int, inputLanguage, 0)
+
+#define tagSystemInformation_FIELDS(FIELD) \
+    FIELD(Int, model, 0)
+
+// clang-format on
+WIRE_RECORD(tagSystemLanguageParam);
+WIRE_RECORD(tagSystemInformation);
 
 } // namespace SystemSetupDef
 

@@ -2,57 +2,16 @@
 
 #include "messaging/ptc/Event.h"
 #include "messaging/ptc/IProxyBase.h"
-#include "messaging/services/ITitler.h"
-#include "messaging/services/ITitlerCallBack.h"
-#include "messaging/services/TitlerParams.h"
 
 #include <cstring>
 #include <memory>
 
-TitlerAdapter::TitlerAdapter(long id) : PTC::Adapter(id)
-{
-}
-
-void TitlerAdapter::setTarget(void* target)
-{
-    m_target = static_cast<ITitler*>(target);
-}
-
 void TitlerAdapter::receive(PTC::Event* event)
 {
-    if (m_target == nullptr) {
-        return;
-    }
-    switch (event->getMethodId()) {
-    case METHOD_showTitlerCreate: {
-        _CALL_TITLER_TYPE param = 0;
-        TitlerParams::deserialize_showTitlerCreate_param(param, event->getData(), event->getSize());
-        m_target->showTitlerCreate(param);
-        break;
-    }
-    case METHOD_showTitlerEdit: {
-        _SHOW_TITLER_PARAMTER param;
-        TitlerParams::deserialize_showTitlerEdit_param(param, event->getData(), event->getSize());
-        m_target->showTitlerEdit(param);
-        break;
-    }
-    case METHOD_showDialogMaskWidget: {
-        bool param = false;
-        TitlerParams::deserialize_showDialogMaskWidget_param(param, event->getData(), event->getSize());
-        m_target->showDialogMaskWidget(param);
-        break;
-    }
-    case METHOD_showMessageMaskWidget: {
-        bool param = false;
-        TitlerParams::deserialize_showMessageMaskWidget_param(param, event->getData(), event->getSize());
-        m_target->showMessageMaskWidget(param);
-        break;
-    }
-    case METHOD_registerCallBack:
+    if (target() != nullptr && event->getMethodId() == METHOD_registerCallBack) {
         receiveRegisterCallBack(event);
-        break;
-    default:
-        break;
+    } else {
+        TargetAdapter::receive(event);
     }
 }
 
@@ -62,7 +21,7 @@ void TitlerAdapter::receiveRegisterCallBack(PTC::Event* event)
 {
     _tagCallBackInfo info;
     if (event->isRemote()) {
-        TitlerParams::deserialize_registerCallBack_param(info, event->getData(), event->getSize());
+        RecordPacking::deserialize(info, event->getData(), event->getSize());
     } else {
         int id = 0;
         if (event->getData() != nullptr && event->getSize() >= static_cast<long>(sizeof id)) {
@@ -80,5 +39,5 @@ void TitlerAdapter::receiveRegisterCallBack(PTC::Event* event)
         return; // whoever registered before keeps the result
     }
     static_cast<void>(proxy.release()); // the target's from here on
-    m_target->registerCallBack(callBack);
+    target()->registerCallBack(callBack);
 }

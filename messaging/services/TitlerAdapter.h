@@ -2,33 +2,21 @@
 #pragma once
 
 #include "messaging/ptc/Adapter.h"
+#include "messaging/services/ITitler.h"
+#include "messaging/services/ServiceFamily.h"
 
-class ITitler;
-
-class TitlerAdapter : public PTC::Adapter
+class TitlerAdapter : public TargetAdapter<ITitler, PTC::Adapter>
 {
 public:
-    static constexpr long INTERFACE_ID = 117;
+    using enum ITitler::Method;
+    static constexpr long INTERFACE_ID = ITitler::INTERFACE_ID;
     // Type asked of the proxy factory for ITitlerCallBack. The factory's proxy must implement that interface.
-    static constexpr long CALLBACK_INTERFACE_ID = 118;
+    static constexpr long CALLBACK_INTERFACE_ID = ITitlerCallBack::ADAPTER_TYPE;
 
-    // Method ids of the wire.
-    enum Method : long {
-        METHOD_showTitlerCreate = 1,
-        METHOD_showTitlerEdit = 2,
-        METHOD_showDialogMaskWidget = 3,
-        METHOD_showMessageMaskWidget = 4,
-        METHOD_registerCallBack = 5,
-    };
-
-    explicit TitlerAdapter(long id);
+    using TargetAdapter::TargetAdapter;
 
     void receive(PTC::Event* event) override;
-    // target is an ITitler*; not owned.
-    void setTarget(void* target) override;
 
 private:
     void receiveRegisterCallBack(PTC::Event* event);
-
-    ITitler* m_target = nullptr;
 };

@@ -1,36 +1,38 @@
-// Records of the service that this program offers, and of its callback.
+// Records of the service that this program offers and of its callback, and of all registrations.
 #pragma once
 
-#include <string>
+#include "messaging/ptc/WireRecord.h"
 
 // Who asked; stored and echoed, its values belong to the callers.
 using _CALL_TITLER_TYPE = int;
 
-// Wire: type (int), path (wide).
-struct _SHOW_TITLER_PARAMTER {
-    _CALL_TITLER_TYPE type = 0;
-    std::wstring path;
-};
+// clang-format off
 
-// Wire: type (int), path (wide), data (raw of size bytes), size (int), count (int).
-// data is itself packed: the paths of the titles made, one wide string after the other. The sender owns it.
+#define _SHOW_TITLER_PARAMTER_FIELDS(FIELD) \
+    FIELD(Int, type, 0) \
+    FIELD(Wide, path)
+
+#define _tagCallBackInfo_FIELDS(FIELD) \
+    FIELD(Id, adapterId, -1) \
+    FIELD(Id, receiverIdentity, -1)
+
+#define _tagNotifyInfo_FIELDS(FIELD) \
+    FIELD(Id, adapterId, -1) \
+    FIELD(Id, receiverIdentity, -1) \
+    FIELD(Int32, clientId, -1)
+
+// clang-format on
+WIRE_RECORD(_SHOW_TITLER_PARAMTER);
+WIRE_RECORD(_tagCallBackInfo);
+WIRE_RECORD(_tagNotifyInfo);
+
+// The result of a create session. On the wire: type (int), path (wide), data (raw of size bytes), size (int),
+// count (int). data is itself packed: the paths of the titles made, see TitlerParams::packPaths. The sender
+// owns it.
 struct _CALLBACK_TITLER_PARAMTER {
     _CALL_TITLER_TYPE type = 0;
     std::wstring path;
     unsigned char* data = nullptr;
     int size = 0;
     int count = 0;
-};
-
-// Wire: adapter id (int32), receiver identity (int32).
-struct _tagCallBackInfo {
-    long adapterId = -1;
-    long receiverIdentity = -1;
-};
-
-// Wire: adapter id (int32), receiver identity (int32), client id (int32).
-struct _tagNotifyInfo {
-    long adapterId = -1;
-    long receiverIdentity = -1;
-    int clientId = -1;
 };

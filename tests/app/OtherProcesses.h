@@ -10,8 +10,7 @@
 #include "app/SystemSetupInfoController.h"
 #include "app/TitlerAPPEventFilterController.h"
 #include "library/FolderNameRules.h"
-#include "messaging/services/MessageCenterParams.h"
-#include "messaging/services/MessageCenterRemoteProxy.h"
+#include "messaging/services/ServiceFamilies.h"
 
 #include <QRandomGenerator>
 #include <thread>

@@ -13,7 +13,7 @@
 #include "library/ArchiveItem.h"
 #include "library/ArchiveList.h"
 #include "library/ArchiveMenu.h"
-#include "messaging/services/FileManagerControllerParams.h"
+#include "messaging/services/ServiceFamilies.h"
 #include "support/FileSyncQueue.h"
 #include "touchui/KSInputContext.h"
 

@@ -11,9 +11,7 @@
 #include "app/TitlerToolFactory.h"
 #include "messaging/ptc/IAdapterBase.h"
 #include "messaging/ptc/IProxyBase.h"
-#include "messaging/services/APPEventFilterParams.h"
-#include "messaging/services/FileManagerControllerParams.h"
-#include "messaging/services/MessageCenterParams.h"
+#include "messaging/services/ServiceFamilies.h"
 
 #include <QSignalSpy>
 #include <QTest>

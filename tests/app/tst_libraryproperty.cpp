@@ -19,7 +19,7 @@
 #include "library/ArchiveMenu.h"
 #include "library/TemplatePicker.h"
 #include "library/TemplateTab.h"
-#include "messaging/services/FileManagerControllerParams.h"
+#include "messaging/services/ServiceFamilies.h"
 #include "touchui/KSInputContext.h"
 #include "touchui/KSPushbutton.h"
 

@@ -22,7 +22,7 @@
 #include "document/TitleParser.h"
 #include "library/ArchiveItem.h"
 #include "library/ArchiveList.h"
-#include "messaging/services/MessageCenterParams.h"
+#include "messaging/services/ServiceFamilies.h"
 #include "touchui/KSInputContext.h"
 #include "touchui/KSPushbutton.h"
 

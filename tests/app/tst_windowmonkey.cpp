@@ -10,7 +10,7 @@
 #include "SoftKeyboardStandIn.h"
 #include "TitleAccount.h"
 #include "WindowFingers.h"
-#include "messaging/services/ITitlerCallBack.h"
+#include "messaging/services/ITitler.h"
 #include "touchui/CustomTreeDelegete.h"
 
 #include <QElapsedTimer>

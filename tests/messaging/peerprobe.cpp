@@ -8,7 +8,7 @@
 #include "messaging/ptc/SocketRemoteReceiver.h"
 #include "messaging/ptc/SocketRemoteSender.h"
 #include "messaging/services/RecordPacking.h"
-#include "messaging/services/ServiceCall.h"
+#include "messaging/services/ServiceFamilies.h"
 #include "messaging/services/ServiceTable.h"
 
 #include <QCoreApplication>

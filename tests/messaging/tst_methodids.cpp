@@ -1,29 +1,7 @@
 // The ids of the methods on the wire, which other programs are built with: a mistake in one would be made by
 // the library and by everything that is tested with it alike.
-#include "messaging/services/APPEventFilterCallBackAdapter.h"
-#include "messaging/services/APPEventFilterNotifyAdapter.h"
-#include "messaging/services/APPEventFilterRemoteProxy.h"
-#include "messaging/services/FileManagerControllerCallBackAdapter.h"
-#include "messaging/services/FileManagerControllerNotifyAdapter.h"
-#include "messaging/services/FileManagerControllerRemoteProxy.h"
-#include "messaging/services/MessageCenterCallBackAdapter.h"
-#include "messaging/services/MessageCenterNotifyAdapter.h"
-#include "messaging/services/MessageCenterRemoteProxy.h"
-#include "messaging/services/PowerManagerCallBackAdapter.h"
-#include "messaging/services/PowerManagerNotifyAdapter.h"
-#include "messaging/services/PowerManagerRemoteProxy.h"
-#include "messaging/services/ProjectDataManagerCallBackAdapter.h"
-#include "messaging/services/ProjectDataManagerNotifyAdapter.h"
-#include "messaging/services/ProjectDataManagerRemoteProxy.h"
-#include "messaging/services/ShowTitlerControllerCallBackAdapter.h"
-#include "messaging/services/ShowTitlerControllerRemoteProxy.h"
-#include "messaging/services/SoftKeyBoardControllerCallBackAdapter.h"
-#include "messaging/services/SoftKeyBoardControllerRemoteProxy.h"
-#include "messaging/services/SystemSetupManagerCallBackAdapter.h"
-#include "messaging/services/SystemSetupManagerNotifyAdapter.h"
-#include "messaging/services/SystemSetupManagerRemoteProxy.h"
+#include "messaging/services/ServiceFamilies.h"
 #include "messaging/services/TitlerAdapter.h"
-#include "messaging/services/TitlerCallBackRemoteProxy.h"
 
 #include <QtTest/QTest>
 

@@ -1,40 +1,21 @@
 // Every method of the eight services, from the proxy to the adapter at the other end, and the table of all
 // services.
-#include "appliance/ClientProxyFactory.h"
 #include "appliance/ServiceAdapter.h"
-#include "appliance/TitlerCallBackAdapter.h"
-#include "appliance/TitlerRemoteProxy.h"
 #include "messaging/ptc/CallbackProxy.h"
 #include "messaging/ptc/IAdapterFactory.h"
 #include "messaging/ptc/IProxyFactory.h"
 #include "messaging/services/IAPPEventFilter.h"
-#include "messaging/services/IAPPEventFilterCallBack.h"
-#include "messaging/services/IAPPEventFilterNotify.h"
 #include "messaging/services/IFileManagerController.h"
-#include "messaging/services/IFileManagerControllerCallBack.h"
-#include "messaging/services/IFileManagerControllerNotify.h"
 #include "messaging/services/IMessageCenter.h"
-#include "messaging/services/IMessageCenterCallBack.h"
-#include "messaging/services/IMessageCenterNotify.h"
 #include "messaging/services/IPowerManager.h"
-#include "messaging/services/IPowerManagerCallBack.h"
-#include "messaging/services/IPowerManagerNotify.h"
 #include "messaging/services/IProjectDataManager.h"
-#include "messaging/services/IProjectDataManagerCallBack.h"
-#include "messaging/services/IProjectDataManagerNotify.h"
 #include "messaging/services/IShowTitlerController.h"
-#include "messaging/services/IShowTitlerControllerCallBack.h"
 #include "messaging/services/ISoftKeyBoardController.h"
-#include "messaging/services/ISoftKeyBoardControllerCallBack.h"
 #include "messaging/services/ISystemSetupManager.h"
-#include "messaging/services/ISystemSetupManagerCallBack.h"
-#include "messaging/services/ISystemSetupManagerNotify.h"
 #include "messaging/services/ITitler.h"
-#include "messaging/services/ITitlerCallBack.h"
 #include "messaging/services/ServiceFamilies.h"
 #include "messaging/services/ServiceTable.h"
 #include "messaging/services/TitlerAdapter.h"
-#include "messaging/services/TitlerCallBackRemoteProxy.h"
 #include "messaging/services/TitlerParams.h"
 #include "tests/messaging/LoopSender.h"
 
@@ -277,7 +258,7 @@ PTC::IProxyBase* TestServices::createProxy(long type, long id, long client)
     }
     PTC::CallbackProxy* proxy = type == TitlerAdapter::CALLBACK_INTERFACE_ID
                                     ? new TitlerCallBackRemoteProxy(id)
-                                    : createClientProxy(type, id);
+                                    : ServiceFamilies::createClientProxy(type, id);
     proxy->setSender(m_toClient.get());
     return proxy;
 }

@@ -1,4 +1,4 @@
-#include "messaging/services/RecordReader.h"
+#include "messaging/ptc/RecordReader.h"
 
 #include "messaging/ptc/CUnpack.h"
 
