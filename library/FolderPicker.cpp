@@ -46,7 +46,7 @@ const int BUTTON_SPACE = 8;
 const int SIDE_MARGIN = FRAME_MARGIN + BUTTON_SPACE; // beside what lies in the frame
 constexpr QSize BUTTON_SIZE(160, 48);
 // Inside the frame, which is dark by itself.
-constexpr QRect MASK_AREA(7, 9, 1088 - 14, 742 - 18);
+constexpr QMargins FRAME(7, 9, 7, 9);
 constexpr QColor FRAME_COLOR(17, 17, 17);
 constexpr QColor FRAME_LINE_COLOR(85, 85, 85);
 
@@ -64,7 +64,7 @@ FolderPicker::FolderPicker(QWidget* parent)
     : QDialog(parent, Qt::Dialog | Qt::FramelessWindowHint)
     , mFactory(new FolderPickerFactory(this))
     , mModel(new KSTreeModel(mFactory, FolderPickerFactory::ColumnCount, this))
-    , mMasks(this, MASK_AREA)
+    , mMasks(this, FRAME)
     , mBackground(QStringLiteral(":/ToolBarbg_bluegrid"))
 {
     setObjectName(QStringLiteral("FolderPickerWindow"));
@@ -250,15 +250,8 @@ void FolderPicker::translateText()
 
 void FolderPicker::showOpacityWidget(bool show)
 {
-    if (mOpacity == nullptr) {
-        mOpacity = new QWidget(this);
-        mOpacity->setFocusPolicy(Qt::NoFocus);
-        QPalette dark;
-        dark.setColor(QPalette::Window, QColor(0, 0, 0, 166));
-        mOpacity->setPalette(dark);
-        mOpacity->setAutoFillBackground(true);
-        mOpacity->setGeometry(rect());
-    }
+    if (mOpacity == nullptr)
+        mOpacity = DialogMasks::createMask(this, rect());
     mOpacity->raise();
     mOpacity->setVisible(show);
 }
@@ -302,12 +295,13 @@ void FolderPicker::paintEvent(QPaintEvent* event)
     QDialog::paintEvent(event);
     QPainter painter(this);
     painter.fillRect(rect(), FRAME_COLOR);
-    painter.fillRect(MASK_AREA, QColor(50, 50, 50));
-    painter.setClipRect(MASK_AREA);
+    const QRect inside = rect().marginsRemoved(FRAME);
+    painter.fillRect(inside, QColor(50, 50, 50));
+    painter.setClipRect(inside);
     painter.drawPixmap(0, 0, mBackground);
     painter.setClipping(false);
     painter.setPen(FRAME_LINE_COLOR);
-    painter.drawRect(MASK_AREA.adjusted(0, 0, -1, -1));
+    painter.drawRect(inside.adjusted(0, 0, -1, -1));
     painter.drawRect(rect().adjusted(0, 0, -1, -1));
     const QImage line(QStringLiteral(":/Separator_H"));
     for (const QPoint& start : {STARTPOINT_OF_TOP_HSEPARATOR, STARTPOINT_OF_BOTTOM_HSEPARATOR})

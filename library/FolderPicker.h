@@ -4,10 +4,10 @@
 // as the main window and is shown by exec(). GUI thread.
 #pragma once
 
-#include "library/DialogMasks.h"
 #include "library/FolderPickerController.h"
 #include "messaging/services/FileManagerDefine.h"
 #include "messaging/services/MessageDefine.h"
+#include "touchui/DialogMasks.h"
 
 #include <QDialog>
 #include <QFont>

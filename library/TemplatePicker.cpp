@@ -31,7 +31,7 @@ const int DIALOG_FRAME = 7; // kind of frame
 const int TITLE_FONT_SIZE = 28;
 const int FONT_SIZE = 24;
 const int CAPTION_HEIGHT = 34;
-constexpr QRect MASK_AREA(10, 6, TemplatePicker::SCREEN_WIDTH - 19, TemplatePicker::SCREEN_HEIGHT - 18);
+constexpr QMargins FRAME(10, 6, 9, 12);
 
 // In the dialog.
 const int TABS_LEFT = (TemplatePicker::SCREEN_WIDTH - TemplatePicker::TAB_AREA_WIDTH) / 2;
@@ -57,7 +57,7 @@ const char BUTTON_IMAGES[] =
 TemplatePicker::TemplatePicker(QWidget* parent)
     : QDialog(parent, Qt::Dialog | Qt::FramelessWindowHint)
     , mReloadRule(SystemSetupDef::emSystemLanguageUnknown, false)
-    , mMasks(this, MASK_AREA)
+    , mMasks(this, FRAME)
 {
     setObjectName(QStringLiteral("TemplateOverview"));
     setStyleSheet(QStringLiteral(" QWidget#TemplateOverview { background:transparent; }"));

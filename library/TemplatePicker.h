@@ -5,13 +5,13 @@
 #pragma once
 
 #include "document/Archive.h"
-#include "library/DialogMasks.h"
 #include "library/TemplateItem.h"
 #include "library/TemplatePickerController.h"
 #include "library/TemplateReloadRule.h"
 #include "library/UserTemplatePickerController.h"
 #include "messaging/services/MessageDefine.h"
 #include "messaging/services/SystemSetupDef.h"
+#include "touchui/DialogMasks.h"
 
 #include <QDialog>
 #include <QPixmap>
