@@ -9,14 +9,13 @@
 #include <QString>
 #include <string>
 
+#include "app/ServiceLink.h"
 #include "document/ITitleChangeReporter.h"
 #include "library/ITitlerFolderReporter.h"
 #include "messaging/services/FileManagerDefine.h"
 #include "messaging/services/IFileManagerController.h"
 #include "messaging/services/IFileManagerControllerCallBack.h"
 #include "messaging/services/IFileManagerControllerNotify.h"
-
-class TitlerToolFactory;
 
 class EditTitlerController : public QObject,
                              public IFileManagerControllerCallBack,
@@ -56,12 +55,12 @@ Q_SIGNALS:
     void folderNameChangeFromFileManager(FileManagerDefine::tagChangeFolderNameParam param);
 
 private:
+    static constexpr long SERVICE_ID = 36;
+
     EditTitlerController() = default;
     ~EditTitlerController() override;
 
     static EditTitlerController* mpInstance;
 
-    IFileManagerController* mProxy = nullptr;
-    int mClientId = -1;
-    bool mConnected = false;
+    ServiceLink<IFileManagerController> mLink{SERVICE_ID};
 };

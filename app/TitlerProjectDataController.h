@@ -3,11 +3,10 @@
 
 #include <QObject>
 
+#include "app/ServiceLink.h"
 #include "messaging/services/IProjectDataManager.h"
 #include "messaging/services/IProjectDataManagerCallBack.h"
 #include "messaging/services/IProjectDataManagerNotify.h"
-
-class TitlerToolFactory;
 
 class TitlerProjectDataController : public QObject,
                                     public IProjectDataManagerCallBack,
@@ -26,12 +25,12 @@ public:
     void loadNotify(int state) override;
 
 private:
+    static constexpr long SERVICE_ID = 76;
+
     TitlerProjectDataController() = default;
     ~TitlerProjectDataController() override;
 
     static TitlerProjectDataController* mInstance;
 
-    IProjectDataManager* mProxy = nullptr;
-    int mClientId = -1;
-    bool mConnected = false;
+    ServiceLink<IProjectDataManager> mLink{SERVICE_ID};
 };
