@@ -14,6 +14,7 @@
 #include "touchui/DialogMasks.h"
 
 #include <QDialog>
+#include <QImage>
 #include <QPixmap>
 #include <QPoint>
 #include <QPointer>
@@ -155,5 +156,6 @@ private:
     KSPushbutton* mDeleteButton2 = nullptr;
     KSPushbutton* mCancelButton = nullptr;
     QPixmap mFrame;
+    QImage mSeparator;
     DialogMasks mMasks;
 };
