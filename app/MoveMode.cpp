@@ -18,7 +18,7 @@ const char BUTTON_IMAGES[] =
     "Button-38selected_Rest_Left:Button-38selected_Rest_Center:Button-38selected_Rest_Right:"
     "Button-38selected_Pressed_Left:Button-38selected_Pressed_Center:Button-38selected_Pressed_Right:::";
 
-// Global coordinates; nothing for events that are no presses.
+// Global coordinates; nothing for an event that is not a press.
 std::optional<QPoint> placeOfPress(const QEvent* event)
 {
     switch (event->type()) {

@@ -126,7 +126,7 @@ TitlerWindow::TitlerWindow(bool deferArchiveList, QWidget* parent)
 
 TitlerWindow::~TitlerWindow()
 {
-    // Events of children that are destroyed must not reach a window that is half gone.
+    // Events of children that are destroyed must not reach a window that is half destroyed.
     if (APPEventFilter* filter = APPEventFilter::instance())
         filter->unegisterEventFilter(this);
     // The canvas must be gone before the service links that its workers report through.
@@ -407,7 +407,7 @@ void TitlerWindow::closeTitlerWindow()
     resetCanvasBackground();
     waitUntilSaved();
     if (mUnsavedWork.ask(*mLinks))
-        return; // and the answer goes on from here
+        return; // continueCloseTitler follows with the answer
 
     EditContextController* context = EditContextController::getInstance();
     if (mSessionEnd.asksFirst() && context->isMainNeedMsg()) {
@@ -458,7 +458,7 @@ void TitlerWindow::continueCloseTitler(MessageDefine::tagCloseParam param)
         return;
     if (mUnsavedWork.takeQuestion()) {
         if (param.closeType != MessageDefine::CLOSE_OK) {
-            // The session goes on; the folder was already given free.
+            // The session continues, but the siblings have been told that the folder is free.
             mLinks->editFolderStarts(mArchiveList->getCurrentPath());
             return;
         }

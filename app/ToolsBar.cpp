@@ -239,7 +239,7 @@ void ToolsBar::clickedSafeAreaButton()
     Q_EMIT SafeAreaButtonClickedForDrawRect(m_safeAreaShown);
 }
 
-// What was drawn goes with the flag.
+// Also removes what was drawn on the canvas.
 void ToolsBar::resetSafeArea()
 {
     const bool wasShown = m_safeAreaShown;

@@ -44,7 +44,7 @@ const int EFFECTIVE_LEFT = 38;  // the scroll bar lies before it
 const int LOADER_POLL = 1;      // ms
 const int LABEL_FONT_SIZE = 13; // points
 
-// What a killed process left half-written in the title folders goes before anything is read from them.
+// Removes what a killed process left half-written in the title folders, before anything is read from them.
 void sweepTitleFolders()
 {
     const std::string root = FolderLookup::multiByte(&IPathManagerEx::getTitleResourcesPath);
@@ -247,7 +247,7 @@ ArchiveItem* ArchiveList::madeItem(int index) const
     return qobject_cast<ArchiveItem*>(madeWidgetItem(index));
 }
 
-// The file may have gone since it was checked.
+// Returns the item of the row, or of the one that follows when its file has been deleted since the check.
 ArchiveItem* ArchiveList::readableItem(int index)
 {
     if (index < 0)
@@ -327,7 +327,7 @@ void ArchiveList::beginCheck()
         mRows.beginCheck();
 }
 
-// Called after a long folder has been scrolled. What is far from view goes first.
+// Called after a long folder has been scrolled. Begins with what is farthest from view.
 void ArchiveList::giveBackItems()
 {
     mGiveBackRequested = false;

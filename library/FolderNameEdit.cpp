@@ -250,7 +250,7 @@ void FolderNameEdit::slotEditStateEnd()
         if (reporter && QFileInfo(m_rows->folderPath(m_oldName)).isDir())
             reporter->changeTitlerFolderName(m_rows->folderPath(m_oldName), m_rows->folderPath(m_oldName));
     } else if (action != FOLDER_EDIT_NONE) {
-        // The tree is still at its editor; the row of a folder that nobody made goes after that.
+        // The tree is still at its editor; the row of a folder that was not made is removed after that.
         const QString source =
             action == FOLDER_EDIT_DUPLICATE ? QFileInfo(m_duplicateSource).fileName() : QString();
         const QPersistentModelIndex row = index;
@@ -296,7 +296,7 @@ bool FolderNameEdit::makeFolder(const QString& name, const QModelIndex& index)
     setRow(index, name);
     m_rows->insertChildrenIndex(index, name);
     if (!QFileInfo(m_rows->folderPath(name)).isDir()) {
-        m_committed = false; // its row goes with the editor
+        m_committed = false; // its row is removed with the editor
         ListMessages::post(isCopy ? MessageDef::MESSAGE_DISK_FULL_ON_DUPLICATE
                                   : MessageDef::MESSAGE_DISK_FULL_ON_CREATE,
                            QCoreApplication::translate("FolderPicker", "folder"));

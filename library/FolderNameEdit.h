@@ -32,7 +32,7 @@ public:
     FolderEditor* editor() const;
     // The row that is being edited; invalid for none.
     QModelIndex row() const { return m_row; }
-    // The same, if the folder is only being made and is none yet.
+    // The same, if the folder is only being made and does not exist yet.
     QModelIndex unmadeRow() const;
     // Returns whether the box is up that reports a name in use.
     bool isMessageUp() const { return m_messageUp; }
@@ -61,7 +61,8 @@ Q_SIGNALS:
     // Full paths; comes before the row has the new name.
     void folderMoved(QString before, QString after);
     void rowAdded();
-    // The row of a folder that was not made is gone, and the one before is current again, if there was any.
+    // The row of a folder that was not made has been removed. The row that was current before is so again, if
+    // there was any.
     void unmadeRowDropped(bool isFolderCurrent);
 
 public Q_SLOTS:

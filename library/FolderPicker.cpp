@@ -116,7 +116,7 @@ FolderPicker::FolderPicker(QWidget* parent)
 
 FolderPicker::~FolderPicker()
 {
-    // What the editor and the tree send while they are destroyed would reach a dialog that is half gone.
+    // What the editor and the tree send while they are destroyed would reach a dialog that is half destroyed.
     const QPointer<FolderEditor> editor = mEdit->editor();
     mEdit->cancelEdit();
     delete editor;
@@ -320,7 +320,7 @@ void FolderPicker::startEditing(QModelIndex index)
     mEdit->startRename(index);
 }
 
-// Folders can go without a word; the row of one that has goes when it is used.
+// Returns whether the folder has been deleted by others without notice; its row is removed then.
 bool FolderPicker::isVanished(const QModelIndex& index)
 {
     const QString name = mRows.nameOf(mRows.folderOf(index));

@@ -70,7 +70,7 @@ QString folderOf(const QString& path)
 }
 
 // The template that a path leads to. Others name any file in its folder, or the folder itself, with a
-// "/" or not; what does not lead to a template goes by the name of the path's folder.
+// "/" or not; for what does not lead to a template it is the name of the path's folder.
 QString templateNameIn(const TemplateTab& tab, const QString& path)
 {
     const QString name = lastPartOf(folderOf(path));
