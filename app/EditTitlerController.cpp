@@ -1,16 +1,8 @@
 #include "app/EditTitlerController.h"
 
-#include "app/EarlyRequests.h"
-#include "app/TitlerToolFactory.h"
-
 #include <QThread>
 #include <cstdint>
 #include <mutex>
-
-namespace
-{
-constexpr long SERVICE_ID = 36;
-}
 
 namespace
 {
@@ -38,50 +30,34 @@ void EditTitlerController::clearInstance()
     mpInstance = nullptr;
 }
 
-EditTitlerController::~EditTitlerController()
-{
-    if (mProxy && mConnected) {
-        mProxy->unregisterCallBack(mClientId);
-        mProxy->unregisterNotify(mClientId);
-    }
-}
+EditTitlerController::~EditTitlerController() = default;
 
 void EditTitlerController::setFactory(TitlerToolFactory* factory)
 {
-    if (mConnected)
-        return;
-    mProxy = factory->createService<IFileManagerController>(SERVICE_ID);
-    if (!mProxy)
-        return;
-    EarlyRequests::getInstance()->expectClientId(SERVICE_ID);
-    mProxy->registerCallBack(this);
+    mLink.connectTo(factory, this);
 }
 
 void EditTitlerController::getClientID(int id)
 {
-    mClientId = id;
-    if (mProxy)
-        mProxy->registerNotify({this, id});
-    mConnected = true;
-    EarlyRequests::getInstance()->clientIdCame(SERVICE_ID);
+    mLink.clientIdCame(id, this);
 }
 
 void EditTitlerController::editFolderStartStatus(QString folder)
 {
-    if (mProxy)
-        mProxy->titlerEditStatus({mClientId, folder.toStdWString()});
+    if (mLink)
+        mLink->titlerEditStatus({mLink.clientId(), folder.toStdWString()});
 }
 
 void EditTitlerController::editFolderEndStatus(QString folder)
 {
-    if (mProxy)
-        mProxy->titlerEditEndStatus({mClientId, folder.toStdWString()});
+    if (mLink)
+        mLink->titlerEditEndStatus({mLink.clientId(), folder.toStdWString()});
 }
 
 void EditTitlerController::renameFolderStartStatus(QString folder)
 {
-    if (mProxy)
-        mProxy->renameFolderStart({mClientId, folder.toStdWString()});
+    if (mLink)
+        mLink->renameFolderStart({mLink.clientId(), folder.toStdWString()});
 }
 
 // The picture thread reports through here too; a sender must not be shared between threads.
@@ -92,20 +68,20 @@ void EditTitlerController::changeTitlerStatus(FileManagerDefine::emTITLECHANGE_T
             this, [this, type, path] { changeTitlerStatus(type, path); }, Qt::QueuedConnection);
         return;
     }
-    if (mProxy)
-        mProxy->updateTitlerStatus({mClientId, path.toStdWString(), type});
+    if (mLink)
+        mLink->updateTitlerStatus({mLink.clientId(), path.toStdWString(), type});
 }
 
 void EditTitlerController::changeTitlerFolderName(QString oldPath, QString newPath)
 {
-    if (mProxy)
-        mProxy->updateTitlerFolderName({mClientId, oldPath.toStdWString(), newPath.toStdWString()});
+    if (mLink)
+        mLink->updateTitlerFolderName({mLink.clientId(), oldPath.toStdWString(), newPath.toStdWString()});
 }
 
 void EditTitlerController::updateTitlerOrder(QString folder)
 {
-    if (mProxy)
-        mProxy->updateTitlerOrder({mClientId, folder.toStdWString()});
+    if (mLink)
+        mLink->updateTitlerOrder({mLink.clientId(), folder.toStdWString()});
 }
 
 void EditTitlerController::importNotify(FileManagerDefine::tagImportNotify notify)

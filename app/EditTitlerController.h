@@ -9,12 +9,11 @@
 #include <QString>
 #include <string>
 
+#include "app/ServiceLink.h"
 #include "document/ITitleChangeReporter.h"
 #include "library/ITitlerFolderReporter.h"
 #include "messaging/services/FileManagerDefine.h"
 #include "messaging/services/IFileManagerController.h"
-
-class TitlerToolFactory;
 
 class EditTitlerController : public QObject,
                              public IFileManagerControllerCallBack,
@@ -54,12 +53,12 @@ Q_SIGNALS:
     void folderNameChangeFromFileManager(FileManagerDefine::tagChangeFolderNameParam param);
 
 private:
+    static constexpr long SERVICE_ID = 36;
+
     EditTitlerController() = default;
     ~EditTitlerController() override;
 
     static EditTitlerController* mpInstance;
 
-    IFileManagerController* mProxy = nullptr;
-    int mClientId = -1;
-    bool mConnected = false;
+    ServiceLink<IFileManagerController> mLink{SERVICE_ID};
 };

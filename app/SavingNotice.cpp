@@ -1,23 +1,13 @@
 #include "app/SavingNotice.h"
 
-#include <QPalette>
-
-namespace
-{
-
-const QColor MASK_COLOR(0, 0, 0, 166);
-
-}
+#include "touchui/DialogMasks.h"
 
 SavingNotice::SavingNotice(QWidget* window) : QLabel(window)
 {
     setFocusPolicy(Qt::NoFocus);
     setAlignment(Qt::AlignCenter);
     setStyleSheet(QStringLiteral("color:rgb(220,220,220); font:40px;"));
-    QPalette mask = palette();
-    mask.setColor(QPalette::Window, MASK_COLOR);
-    setPalette(mask);
-    setAutoFillBackground(true);
+    DialogMasks::darken(this);
     hide();
 }
 

@@ -1,15 +1,8 @@
 #include "app/ShowMessageController.h"
 
-#include "app/EarlyRequests.h"
-#include "app/TitlerToolFactory.h"
 #include "support/LogManager.h"
 
 #include <mutex>
-
-namespace
-{
-constexpr long SERVICE_ID = 65;
-}
 
 namespace Titler_ShowMessage
 {
@@ -34,33 +27,18 @@ void ShowMessageController::clearInstance()
 
 ShowMessageController::ShowMessageController() = default;
 
-ShowMessageController::~ShowMessageController()
-{
-    if (mProxy && mConnected) {
-        mProxy->unregisterCallBack(mClientId);
-        mProxy->unregisterNotify(mClientId);
-    }
-}
+ShowMessageController::~ShowMessageController() = default;
 
 void ShowMessageController::setFactory(TitlerToolFactory* factory)
 {
-    if (mConnected)
-        return;
-    LOG_DEBUG_OPERATE(L"ShowMessageController", 200, L"ShowMessageController::setFactory");
-    mProxy = factory->createService<IMessageCenter>(SERVICE_ID);
-    if (!mProxy)
-        return;
-    EarlyRequests::getInstance()->expectClientId(SERVICE_ID);
-    mProxy->registerCallBack(this);
+    if (!mLink.isConnected())
+        LOG_DEBUG_OPERATE(L"ShowMessageController", 200, L"ShowMessageController::setFactory");
+    mLink.connectTo(factory, this);
 }
 
 void ShowMessageController::setClientID(int id)
 {
-    mClientId = id;
-    if (mProxy)
-        mProxy->registerNotify({this, id});
-    mConnected = true;
-    EarlyRequests::getInstance()->clientIdCame(SERVICE_ID);
+    mLink.clientIdCame(id, this);
 }
 
 void ShowMessageController::postMessage(MessageDef::Message_ID id)
@@ -76,14 +54,14 @@ void ShowMessageController::postMessage(MessageDef::Message_ID id, QString text)
 void ShowMessageController::postMessage(MessageDef::Message_ID id, MessageDefine::_emBoxType boxType,
                                         QString text)
 {
-    if (!mProxy)
+    if (!mLink)
         return;
     MessageDefine::_tagMessageParam param;
-    param.clientId = mClientId;
+    param.clientId = mLink.clientId();
     param.boxType = boxType;
     param.text = text.toStdWString();
     param.messageId = id;
-    mProxy->postMessage(param);
+    mLink->postMessage(param);
 }
 
 void ShowMessageController::setMessageMainWindow(QWidget* window)
@@ -104,14 +82,14 @@ QMap<QString, QString> ShowMessageController::getMapData()
 
 void ShowMessageController::closeMessage(MessageDefine::_emCloseType type)
 {
-    if (mProxy)
-        mProxy->closeMessage({mClientId, type, mLastMessageId});
+    if (mLink)
+        mLink->closeMessage({mLink.clientId(), type, mLastMessageId});
 }
 
 void ShowMessageController::changeTopWindow(MessageDefine::_emTopWindow top)
 {
-    if (mProxy)
-        mProxy->setTopWindow({mClientId, top});
+    if (mLink)
+        mLink->setTopWindow({mLink.clientId(), top});
 }
 
 bool ShowMessageController::mainWindowIsShown() const

@@ -10,6 +10,7 @@
 #include <QString>
 #include <QWidget>
 
+#include "app/ServiceLink.h"
 #include "canvas/MessageBoxController.h"
 #include "messaging/services/IMessageCenter.h"
 #include "messaging/services/MessageDefine.h"
@@ -58,6 +59,8 @@ Q_SIGNALS:
     void signalsShowMessageMaskWidget(bool show);
 
 private:
+    static constexpr long SERVICE_ID = 65;
+
     ShowMessageController();
     ~ShowMessageController() override;
 
@@ -65,11 +68,9 @@ private:
 
     static ShowMessageController* mInstance;
 
-    int mClientId = -1;
     int mLastMessageId = -1;
-    IMessageCenter* mProxy = nullptr;
+    ServiceLink<IMessageCenter> mLink{SERVICE_ID};
     QMap<QString, QString> mMapData;
     QPointer<QWidget> mMainWindow;
     bool mTitlerIsTop = false;
-    bool mConnected = false;
 };

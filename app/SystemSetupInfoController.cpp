@@ -1,14 +1,6 @@
 #include "app/SystemSetupInfoController.h"
 
-#include "app/EarlyRequests.h"
-#include "app/TitlerToolFactory.h"
-
 #include <mutex>
-
-namespace
-{
-constexpr long SERVICE_ID = 114;
-}
 
 namespace
 {
@@ -35,34 +27,19 @@ void SystemSetupInfoController::clearInstance()
     mpInstance = nullptr;
 }
 
-SystemSetupInfoController::~SystemSetupInfoController()
-{
-    if (mProxy && mConnected) {
-        mProxy->unregisterCallBack(mClientId);
-        mProxy->unregisterNotifyCallBack(mClientId);
-    }
-}
+SystemSetupInfoController::~SystemSetupInfoController() = default;
 
 void SystemSetupInfoController::setFactory(TitlerToolFactory* factory)
 {
-    if (mConnected)
-        return;
-    mProxy = factory->createService<ISystemSetupManager>(SERVICE_ID);
-    if (!mProxy)
-        return;
-    EarlyRequests::getInstance()->expectClientId(SERVICE_ID);
-    mProxy->registerCallBack(this);
+    mLink.connectTo(factory, this);
 }
 
 void SystemSetupInfoController::getClientID(int id)
 {
-    mClientId = id;
-    if (mProxy)
-        mProxy->registerNotifyCallBack({this, id});
-    mConnected = true;
-    getModuleInfo();
-    getLanguageInfo();
-    EarlyRequests::getInstance()->clientIdCame(SERVICE_ID);
+    mLink.clientIdCame(id, this, [this] {
+        getModuleInfo();
+        getLanguageInfo();
+    });
 }
 
 void SystemSetupInfoController::getInputLanguage()
@@ -73,14 +50,14 @@ void SystemSetupInfoController::getInputLanguage()
 
 void SystemSetupInfoController::getModuleInfo()
 {
-    if (mProxy)
-        mProxy->getInformation(mClientId);
+    if (mLink)
+        mLink->getInformation(mLink.clientId());
 }
 
 void SystemSetupInfoController::getLanguageInfo()
 {
-    if (mProxy)
-        mProxy->getLanguageInfo(mClientId);
+    if (mLink)
+        mLink->getLanguageInfo(mLink.clientId());
 }
 
 void SystemSetupInfoController::getLanguageInfoCallBack(SystemSetupDef::tagSystemLanguageParam param)

@@ -2,11 +2,10 @@
 // and tells of each change. GUI thread.
 #pragma once
 
+#include "app/ServiceLink.h"
 #include "canvas/IInputLanguageSource.h"
 #include "messaging/services/ISystemSetupManager.h"
 #include "messaging/services/SystemSetupDef.h"
-
-class TitlerToolFactory;
 
 class SystemSetupInfoController : public IInputLanguageSource,
                                   public ISystemSetupManagerCallBack,
@@ -40,13 +39,13 @@ Q_SIGNALS:
     void signalsSystemInfo(SystemSetupDef::emInformationModel model);
 
 private:
+    static constexpr long SERVICE_ID = 114;
+
     SystemSetupInfoController() = default;
     ~SystemSetupInfoController() override;
 
     static SystemSetupInfoController* mpInstance;
 
-    ISystemSetupManager* mProxy = nullptr;
-    int mClientId = DEFAULT_CLIENTID;
-    bool mConnected = false;
+    ServiceLink<ISystemSetupManager> mLink{SERVICE_ID};
     SystemSetupDef::tagSystemLanguageParam mLanguage;
 };

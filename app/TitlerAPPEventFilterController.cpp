@@ -1,14 +1,6 @@
 #include "app/TitlerAPPEventFilterController.h"
 
-#include "app/EarlyRequests.h"
-#include "app/TitlerToolFactory.h"
-
 #include <mutex>
-
-namespace
-{
-constexpr long SERVICE_ID = 1;
-}
 
 namespace
 {
@@ -34,45 +26,29 @@ void TitlerAPPEventFilterController::clearInstance()
     mInstance = nullptr;
 }
 
-TitlerAPPEventFilterController::~TitlerAPPEventFilterController()
-{
-    if (mProxy && mConnected) {
-        mProxy->unregisterCallBack(mClientId);
-        mProxy->unregisterNotify(mClientId);
-    }
-}
+TitlerAPPEventFilterController::~TitlerAPPEventFilterController() = default;
 
 void TitlerAPPEventFilterController::initialize(TitlerToolFactory* factory)
 {
-    if (mConnected)
-        return;
-    mProxy = factory->createService<IAPPEventFilter>(SERVICE_ID);
-    if (!mProxy)
-        return;
-    EarlyRequests::getInstance()->expectClientId(SERVICE_ID);
-    mProxy->registerCallBack(this);
+    mLink.connectTo(factory, this);
 }
 
 void TitlerAPPEventFilterController::setClientID(int id)
 {
-    mClientId = id;
-    if (mProxy)
-        mProxy->registerNotify({this, id});
-    mConnected = true;
-    EarlyRequests::getInstance()->clientIdCame(SERVICE_ID);
+    mLink.clientIdCame(id, this);
 }
 
 void TitlerAPPEventFilterController::sendAPPEvent(APPEventDefine::LOCKTYPE type, bool on)
 {
-    if (mProxy)
-        mProxy->postAPPEventFilter({mClientId, type, on, APPEventDefine::EVENTREVICER_TITLER});
+    if (mLink)
+        mLink->postAPPEventFilter({mLink.clientId(), type, on, APPEventDefine::EVENTREVICER_TITLER});
 }
 
 void TitlerAPPEventFilterController::informRestoreOriginal(APPEventDefine::EventRevicer receiver)
 {
-    if (mProxy)
-        mProxy->postRestoreOriginal(
-            {mClientId, APPEventDefine::LOCKTYPE_NONE, false, APPEventDefine::EVENTREVICER_TITLER});
+    if (mLink)
+        mLink->postRestoreOriginal(
+            {mLink.clientId(), APPEventDefine::LOCKTYPE_NONE, false, APPEventDefine::EVENTREVICER_TITLER});
     if (receiver == APPEventDefine::EVENTREVICER_RESTORE_ALL)
         Q_EMIT signalRestoreOriginal();
 }

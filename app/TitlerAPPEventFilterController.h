@@ -2,6 +2,7 @@
 // takes their announcements. GUI thread.
 #pragma once
 
+#include "app/ServiceLink.h"
 #include "messaging/services/APPEventDefine.h"
 #include "messaging/services/IAPPEventFilter.h"
 #include "touchui/ITitlerAPPEventFilterController.h"
@@ -27,12 +28,12 @@ public:
     void postRestoreFocusNotify() override;
 
 private:
+    static constexpr long SERVICE_ID = 1;
+
     TitlerAPPEventFilterController() = default;
     ~TitlerAPPEventFilterController() override;
 
     static TitlerAPPEventFilterController* mInstance;
 
-    IAPPEventFilter* mProxy = nullptr;
-    int mClientId = -1;
-    bool mConnected = false;
+    ServiceLink<IAPPEventFilter> mLink{SERVICE_ID};
 };

@@ -1,16 +1,9 @@
 #include "app/TitlerPowerController.h"
 
-#include "app/EarlyRequests.h"
-#include "app/TitlerToolFactory.h"
 #include "support/LogManager.h"
 
 #include <mutex>
 #include <unistd.h>
-
-namespace
-{
-constexpr long SERVICE_ID = 71;
-}
 
 namespace
 {
@@ -37,32 +30,20 @@ void TitlerPowerController::clearInstance()
 TitlerPowerController::~TitlerPowerController()
 {
     LOG_EVENT(L"[TitlerPowerController][~TitlerPowerController]", 200, L" Titler closeClient", 6);
-    if (!mProxy || !mConnected)
+    if (!mLink || !mLink.isConnected())
         return;
-    mProxy->closeClient(mClientId);
+    mLink->closeClient(mLink.clientId());
     ::sleep(DROP_CLIENT_SECONDS);
-    mProxy->unregisterCallBack(mClientId);
-    mProxy->unregisterNotify(mClientId);
 }
 
 void TitlerPowerController::setFactory(TitlerToolFactory* factory)
 {
-    if (mConnected)
-        return;
-    mProxy = factory->createService<IPowerManager>(SERVICE_ID);
-    if (!mProxy)
-        return;
-    EarlyRequests::getInstance()->expectClientId(SERVICE_ID);
-    mProxy->registerCallBack(this);
+    mLink.connectTo(factory, this);
 }
 
 void TitlerPowerController::getClientID(int id)
 {
-    mClientId = id;
-    if (mProxy)
-        mProxy->registerNotify({this, id});
-    mConnected = true;
-    EarlyRequests::getInstance()->clientIdCame(SERVICE_ID);
+    mLink.clientIdCame(id, this);
 }
 
 void TitlerPowerController::powerOff()

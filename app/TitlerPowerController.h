@@ -3,9 +3,8 @@
 
 #include <QObject>
 
+#include "app/ServiceLink.h"
 #include "messaging/services/IPowerManager.h"
-
-class TitlerToolFactory;
 
 class TitlerPowerController : public QObject, public IPowerManagerCallBack, public IPowerManagerNotify
 {
@@ -27,12 +26,12 @@ Q_SIGNALS:
     void signalPowerOff();
 
 private:
+    static constexpr long SERVICE_ID = 71;
+
     TitlerPowerController() = default;
     ~TitlerPowerController() override;
 
     static TitlerPowerController* mInstance;
 
-    IPowerManager* mProxy = nullptr;
-    int mClientId = -1;
-    bool mConnected = false;
+    ServiceLink<IPowerManager> mLink{SERVICE_ID};
 };

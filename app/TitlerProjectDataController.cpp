@@ -1,15 +1,8 @@
 #include "app/TitlerProjectDataController.h"
 
-#include "app/EarlyRequests.h"
 #include "app/SystemSetupInfoController.h"
-#include "app/TitlerToolFactory.h"
 
 #include <mutex>
-
-namespace
-{
-constexpr long SERVICE_ID = 76;
-}
 
 namespace
 {
@@ -32,32 +25,16 @@ void TitlerProjectDataController::clearInstance()
     mInstance = nullptr;
 }
 
-TitlerProjectDataController::~TitlerProjectDataController()
-{
-    if (mProxy && mConnected) {
-        mProxy->unregisterCallBack(mClientId);
-        mProxy->unregisterNotifyCallBack(mClientId);
-    }
-}
+TitlerProjectDataController::~TitlerProjectDataController() = default;
 
 void TitlerProjectDataController::setFactory(TitlerToolFactory* factory)
 {
-    if (mConnected)
-        return;
-    mProxy = factory->createService<IProjectDataManager>(SERVICE_ID);
-    if (!mProxy)
-        return;
-    EarlyRequests::getInstance()->expectClientId(SERVICE_ID);
-    mProxy->registerCallBack(this);
+    mLink.connectTo(factory, this);
 }
 
 void TitlerProjectDataController::getClientID(int id)
 {
-    mClientId = id;
-    if (mProxy)
-        mProxy->registerNotifyCallBack({this, id});
-    mConnected = true;
-    EarlyRequests::getInstance()->clientIdCame(SERVICE_ID);
+    mLink.clientIdCame(id, this);
 }
 
 void TitlerProjectDataController::loadNotify(int state)

@@ -3,9 +3,8 @@
 
 #include <QObject>
 
+#include "app/ServiceLink.h"
 #include "messaging/services/IProjectDataManager.h"
-
-class TitlerToolFactory;
 
 class TitlerProjectDataController : public QObject,
                                     public IProjectDataManagerCallBack,
@@ -24,12 +23,12 @@ public:
     void loadNotify(int state) override;
 
 private:
+    static constexpr long SERVICE_ID = 76;
+
     TitlerProjectDataController() = default;
     ~TitlerProjectDataController() override;
 
     static TitlerProjectDataController* mInstance;
 
-    IProjectDataManager* mProxy = nullptr;
-    int mClientId = -1;
-    bool mConnected = false;
+    ServiceLink<IProjectDataManager> mLink{SERVICE_ID};
 };

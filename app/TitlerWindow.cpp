@@ -1,29 +1,23 @@
-// Building, layout and painting of the window; see TitlerWindowSession.cpp for requests and closing,
-// TitlerWindowTouch.cpp for events, masks and language, and TitlerWindowWiring.cpp for the connections.
 #include "app/TitlerWindow.h"
 
 #include "app/APPEventFilter.h"
-#include "app/EarlyRequests.h"
 #include "app/EditContextController.h"
-#include "app/EditTitlerController.h"
+#include "app/MoveMode.h"
 #include "app/SavingNotice.h"
-#include "app/ShowMessageController.h"
-#include "app/ShowTitlerController.h"
-#include "app/SystemSetupInfoController.h"
-#include "app/TitlerAPPEventFilterController.h"
-#include "app/TitlerPowerController.h"
-#include "app/TitlerProjectDataController.h"
-#include "app/TitlerToolFactory.h"
+#include "app/SiblingLinks.h"
 #include "app/ToolsBar.h"
+#include "app/WindowDialogs.h"
+#include "app/WindowLayout.h"
+#include "app/WindowMasks.h"
 #include "canvas/CanvasScene.h"
-#include "canvas/DrawBoundingRectangle.h"
 #include "canvas/GraphicsView.h"
 #include "library/ArchiveList.h"
 #include "library/FolderPicker.h"
 #include "library/TemplatePicker.h"
 #include "library/ThumbnailRender.h"
-#include "messaging/services/ISoftKeyBoardController.h"
 #include "panel/TextToolsPanel.h"
+#include "support/ConfinedPath.h"
+#include "support/IPathManagerEx.h"
 #include "support/LogManager.h"
 #include "touchui/Balloon.h"
 #include "touchui/KSInputContext.h"
@@ -35,14 +29,21 @@
 
 #include <QAction>
 #include <QApplication>
-#include <QHBoxLayout>
-#include <QImageReader>
+#include <QCloseEvent>
+#include <QDebug>
+#include <QFileInfo>
+#include <QGraphicsView>
+#include <QInputMethodEvent>
 #include <QLabel>
+#include <QMenu>
+#include <QMouseEvent>
 #include <QPainter>
 #include <QPushButton>
-#include <QTranslator>
-#include <QVBoxLayout>
-#include <new>
+#include <QSlider>
+#include <QTimer>
+#include <QUndoCommand>
+#include <string>
+#include <utility>
 
 TitlerWindow* pMainWindow = nullptr;
 
@@ -61,31 +62,38 @@ namespace
 {
 
 constexpr int UNDO_LIMIT = 25;
-constexpr long SOFT_KEYBOARD_SERVICE_ID = 95;
 constexpr int ARCHIVELISTWIDGET_HEIGHT = 997;
 constexpr int TITLE_ROW_HEIGHT = 38;
-constexpr QPoint WINDOW_PANEL_POS(8, 8);
-constexpr QPoint LEFT_PANEL_POS(12, 61);
+constexpr int SYNC_DEADLINE = 10000; // ms
+constexpr int LOG_NUMBER = 400;
+constexpr int FOCUS_COMMAND_ID = 1;
+constexpr int CANVAS_CHECKER = 2;
 
-const char MOVE_BUTTON_IMAGES[] =
-    "TextToolPanel_Buttons:Button-38B_Rest_Left:Button-38B_Rest_Center:Button-38B_Rest_Right:"
-    "Button-38B_Pressed_Left:Button-38B_Pressed_Center:Button-38B_Pressed_Right::::"
-    "Button-38selected_Rest_Left:Button-38selected_Rest_Center:Button-38selected_Rest_Right:"
-    "Button-38selected_Pressed_Left:Button-38selected_Pressed_Center:Button-38selected_Pressed_Right:::";
-
-template <typename Layout>
-Layout* newLayout()
+bool isBelowTitles(const QString& path)
 {
-    auto* layout = new Layout;
-    layout->setContentsMargins(0, 0, 0, 0);
-    layout->setSpacing(0);
-    return layout;
+    return ConfinedPath::isBelow(&IPathManagerEx::getTitleResourcesPath, path.toStdString());
+}
+
+bool isGraphicsView(const QWidget* widget)
+{
+    // The point may lie on the view's viewport.
+    for (; widget; widget = widget->parentWidget()) {
+        if (qobject_cast<const QGraphicsView*>(widget))
+            return true;
+    }
+    return false;
+}
+
+// What lies there is not ours to change or to clean up.
+void logRefusedRequest(const QString& path)
+{
+    ConfinedPath::logRefusal(L"a request asks for what lies outside: ", path.toStdString());
 }
 
 } // namespace
 
 TitlerWindow::TitlerWindow(bool deferArchiveList, QWidget* parent)
-    : QMainWindow(parent, Qt::FramelessWindowHint), m_bDeferArchiveList(deferArchiveList)
+    : QMainWindow(parent, Qt::FramelessWindowHint)
 {
     INIT_LOGGING(L"KS2Titler");
     setAppDefaultParameter();
@@ -93,9 +101,7 @@ TitlerWindow::TitlerWindow(bool deferArchiveList, QWidget* parent)
     KSMenu::setMainWindow(this);
     KSScrollViewerWidget::s_mainWnd = this;
     ICanvasHost::setInstance(this);
-    MessageBoxController::setProvider(
-        []() -> MessageBoxController* { return ShowMessageController::getInstance(); },
-        &ShowMessageController::clearInstance);
+    mLinks = std::make_unique<SiblingLinks>();
 
     setWindowTitle(tr("Titler"));
     setGeometry(MAIN_RECT);
@@ -105,13 +111,13 @@ TitlerWindow::TitlerWindow(bool deferArchiveList, QWidget* parent)
     setPalette(windowPalette);
 
     mUndoStack.setUndoLimit(UNDO_LIMIT);
-    initWindowWidget();
+    initWindowWidget(deferArchiveList);
     initChildWindows();
     connectWidget();
     Balloon::s_ParentWindow = this;
     KSToolTip::s_mainWindow = this;
-    initProcessFactory();
-    initProcessCommunications();
+    mLinks->initProcessFactory();
+    mLinks->initProcessCommunications(winId());
     connectForController();
     mArchiveList->setMainScene(mCanvasScene);
     if (APPEventFilter* filter = APPEventFilter::instance())
@@ -120,7 +126,7 @@ TitlerWindow::TitlerWindow(bool deferArchiveList, QWidget* parent)
 
 TitlerWindow::~TitlerWindow()
 {
-    // Events of children that go must not reach a window that is half gone.
+    // Events of children that are destroyed must not reach a window that is half destroyed.
     if (APPEventFilter* filter = APPEventFilter::instance())
         filter->unegisterEventFilter(this);
     // The canvas must be gone before the service links that its workers report through.
@@ -136,27 +142,13 @@ TitlerWindow::~TitlerWindow()
     delete mGraphicsView;
     delete mCanvasScene;
 
-    EarlyRequests::clearInstance();
-    ShowTitlerController::clearInstance();
-    SystemSetupInfoController::clearInstance();
-    ShowMessageController::clearInstance();
-    TitlerPowerController::clearInstance();
-    EditContextController::clearInstance();
-    TitlerProjectDataController::clearInstance();
-    TitlerAPPEventFilterController::clearInstance();
-    if (mInputContext)
-        mInputContext->setKeyBoardController(nullptr);
-    if (mTranslator)
-        mTranslator->deleteLater();
-    MessageBoxController::setProvider(nullptr, nullptr);
     ICanvasHost::setInstance(nullptr);
-    mFactory.reset();
+    mLinks.reset();
     UNINIT_LOGGING();
 }
 
 void TitlerWindow::setAppDefaultParameter()
 {
-    mTranslator = nullptr;
     QApplication::setFont(QFont(QStringLiteral("KST-Medium"), 12));
     const QPalette before = QApplication::palette();
     QPalette applicationPalette;
@@ -166,25 +158,15 @@ void TitlerWindow::setAppDefaultParameter()
     QApplication::setPalette(before, "QObject");
 }
 
-void TitlerWindow::initWindowWidget()
+// --- Building -------------------------------------------------------------------------------------------
+
+void TitlerWindow::initWindowWidget(bool deferArchiveList)
 {
     createToolsBar();
     createCanvasScene();
-    createArchiveList();
+    QWidget* leftColumn = createArchiveList(deferArchiveList);
     createTextToolsPanel();
-
-    auto* mainRow = newLayout<QHBoxLayout>();
-    mainRow->addSpacing(8);
-    mainRow->addWidget(createLeftColumn());
-    mainRow->addLayout(createRightColumn());
-
-    auto* central = new QWidget(this);
-    auto* column = newLayout<QVBoxLayout>();
-    column->addSpacing(8);
-    column->addLayout(mainRow);
-    column->addStretch();
-    central->setLayout(column);
-    setCentralWidget(central);
+    WindowLayout::arrange(this, leftColumn, mToolsBar, mGraphicsView, mTextToolsPanel);
 }
 
 void TitlerWindow::createToolsBar()
@@ -202,32 +184,22 @@ void TitlerWindow::createCanvasScene()
     connect(mGraphicsView, &GraphicsView::deleteEmptyItem, this, &TitlerWindow::slotDeleteEmptyItems);
 }
 
-void TitlerWindow::createArchiveList()
+// Returns the left column: the title row above the list.
+QWidget* TitlerWindow::createArchiveList(bool deferArchiveList)
 {
-    mPathLabel = new QLabel;
-    mPathLabel->setStyleSheet(QStringLiteral("color:rgb(220,220,220); text-align:left; font:28px;"));
+    auto* pathLabel = new QLabel;
+    pathLabel->setStyleSheet(QStringLiteral("color:rgb(220,220,220); text-align:left; font:28px;"));
     // The lines of some families are higher, and the list under the row has a frame at a fixed place.
-    mPathLabel->setFixedHeight(TITLE_ROW_HEIGHT);
+    pathLabel->setFixedHeight(TITLE_ROW_HEIGHT);
 
-    mFolderIcon = new QPushButton(this);
-    mFolderIcon->setIcon(QIcon(QStringLiteral(":/FolderPicker/Titler_folder_icon")));
-    mFolderIcon->setFixedSize(28, 30);
-    mFolderIcon->setIconSize(QSize(28, 28));
-    mFolderIcon->setEnabled(false);
-    mFolderIcon->setStyleSheet(QStringLiteral("border:0; background:transparent;"));
+    mMoveMode = std::make_unique<MoveMode>(this);
+    connect(mMoveMode->button(), &QPushButton::clicked, this, &TitlerWindow::editAndDoneButtonClicked);
+    connect(mMoveMode->button(), &QPushButton::pressed, this, &TitlerWindow::moveButtonPressed);
+    connect(mMoveMode->button(), &QPushButton::released, this, &TitlerWindow::moveButtonReleased);
 
-    mMoveButton = new KSPushbutton(QString::fromLatin1(MOVE_BUTTON_IMAGES), this);
-    mMoveButton->setFixedSize(70, TITLE_ROW_HEIGHT);
-    mMoveButton->setText(tr("Move"));
-    mMoveButton->setStyleSheet(QStringLiteral("color:rgb(220, 220, 220); font:20px;"));
-    mMoveButton->setFocusPolicy(Qt::NoFocus);
-    mMoveButton->setAttribute(Qt::WA_AcceptTouchEvents);
-    connect(mMoveButton, &QPushButton::clicked, this, &TitlerWindow::editAndDoneButtonClicked);
-    connect(mMoveButton, &QPushButton::pressed, this, &TitlerWindow::moveButtonPressed);
-    connect(mMoveButton, &QPushButton::released, this, &TitlerWindow::moveButtonReleased);
-
-    mArchiveList = new ArchiveList(mPathLabel, !m_bDeferArchiveList, this);
+    mArchiveList = new ArchiveList(pathLabel, !deferArchiveList, this);
     mArchiveList->setFixedSize(ARCHIVELISTWIDGET_WIDTH, ARCHIVELISTWIDGET_HEIGHT);
+    return WindowLayout::leftColumn(this, pathLabel, mMoveMode->button(), mArchiveList);
 }
 
 void TitlerWindow::createTextToolsPanel()
@@ -235,130 +207,27 @@ void TitlerWindow::createTextToolsPanel()
     mTextToolsPanel = new TextToolsPanel(this);
 }
 
-QWidget* TitlerWindow::createLeftColumn()
-{
-    auto* titleRow = newLayout<QHBoxLayout>();
-    titleRow->addSpacing(6);
-    titleRow->addWidget(mFolderIcon);
-    titleRow->addSpacing(7);
-    titleRow->addWidget(mPathLabel);
-    titleRow->addStretch();
-    titleRow->addWidget(mMoveButton);
-    titleRow->addSpacing(0);
-
-    auto* column = newLayout<QVBoxLayout>();
-    column->addSpacing(8);
-    column->addLayout(titleRow);
-    column->addSpacing(10);
-    column->addWidget(mArchiveList, 2);
-    column->addStretch();
-
-    auto* row = newLayout<QHBoxLayout>();
-    row->addSpacing(6);
-    row->addLayout(column);
-
-    auto* left = new QWidget(this);
-    left->setFixedWidth(ARCHIVELISTWIDGET_WIDTH);
-    left->setLayout(row);
-    return left;
-}
-
-QLayout* TitlerWindow::createRightColumn()
-{
-    auto* canvasRow = newLayout<QHBoxLayout>();
-    canvasRow->addSpacing(52);
-    canvasRow->addWidget(mGraphicsView);
-    canvasRow->addSpacing(31);
-
-    auto* column = newLayout<QVBoxLayout>();
-    column->addWidget(mToolsBar);
-    column->addSpacing(22);
-    column->addLayout(canvasRow);
-    column->addSpacing(43);
-    column->addWidget(mTextToolsPanel);
-    column->addStretch();
-    return column;
-}
-
 void TitlerWindow::initChildWindows()
 {
-    mOpacityMask = createMask();
-    mOpacityMask->setParent(this);
-    mOpacityMask->setGeometry(rect());
-    mOpacityMask->raise();
-    mOpacityMask->hide();
     mSavingNotice = new SavingNotice(this);
     mFolderPicker = new FolderPicker(this);
     mTemplatePicker = new TemplatePicker(this);
+    mMasks = std::make_unique<WindowMasks>(this, mTextToolsPanel, mFolderPicker, mTemplatePicker);
+    mDialogs = std::make_unique<WindowDialogs>(this, mMasks.get(), mFolderPicker, mTemplatePicker);
 }
 
-void TitlerWindow::initProcessFactory()
-{
-    mFactory.reset(new (std::nothrow) TitlerToolFactory);
-    // A port that cannot be bound leaves a window that no request can reach; the siblings' services still
-    // work.
-    if (mFactory)
-        mFactory->initialize();
-}
-
-void TitlerWindow::initProcessCommunications()
-{
-    if (!mFactory)
-        return;
-    mInputContext = KSInputContext::instance();
-    mSoftKeyBoardController = mFactory->createService<ISoftKeyBoardController>(SOFT_KEYBOARD_SERVICE_ID);
-    if (mInputContext) {
-        mInputContext->setWindowID(winId());
-        if (mSoftKeyBoardController)
-            mSoftKeyBoardController->registerCallBack(mInputContext);
-        mInputContext->setKeyBoardController(mSoftKeyBoardController);
-    }
-
-    mShowTitlerController = ShowTitlerController::getInstance();
-    mSystemSetupInfoController = SystemSetupInfoController::getInstance();
-    mEditTitlerController = EditTitlerController::getInstance();
-    mShowMessageController = ShowMessageController::getInstance();
-    mTitlerPowerController = TitlerPowerController::getInstance();
-    mTitlerProjectDataController = TitlerProjectDataController::getInstance();
-    mTitlerAPPEventFilterController = TitlerAPPEventFilterController::getInstance();
-
-    mShowTitlerController->setFactory(mFactory.get());
-    mSystemSetupInfoController->setFactory(mFactory.get());
-    mEditTitlerController->setFactory(mFactory.get());
-    mShowMessageController->setFactory(mFactory.get());
-    mTitlerPowerController->setFactory(mFactory.get());
-    mTitlerProjectDataController->setFactory(mFactory.get());
-    mTitlerAPPEventFilterController->initialize(mFactory.get());
-    mTitlerAPPEventFilterController->sendAPPEvent(APPEventDefine::LOCKTYPE_OBJECT, false);
-}
+// --- Events ---------------------------------------------------------------------------------------------
 
 void TitlerWindow::paintEvent(QPaintEvent* event)
 {
     QMainWindow::paintEvent(event);
     QPainter painter(this);
-    painter.drawPixmap(WINDOW_PANEL_POS, mWindowPanelPixmap);
-    painter.drawPixmap(LEFT_PANEL_POS, mLeftPanelPixmap);
-    drawCanvasSceneBG(painter);
-    painter.drawImage(VSEPARATOR_RECT, QImage(QStringLiteral(":/Separator_V")));
-    const QImage horizontal(QStringLiteral(":/Separator_H"));
-    painter.drawImage(HSEPARATOR_TOP_RECT, horizontal);
-    painter.drawImage(HSEPARATOR_BOTTOM_RECT, horizontal);
-}
-
-void TitlerWindow::drawCanvasSceneBG(QPainter& painter)
-{
-    if (mCanvasPixmap.isNull()) {
-        QImageReader reader(QStringLiteral(":/PanelBG/Titler_Canvas"));
-        mCanvasPixmap = QPixmap::fromImageReader(&reader);
-    }
-    painter.drawPixmap(STARTPOINT_OF_CANVASSCENE_BG, mCanvasPixmap);
+    mBackground.paint(painter);
 }
 
 void TitlerWindow::resizeEvent(QResizeEvent* event)
 {
-    DrawBoundingRectangle frames;
-    mLeftPanelPixmap = frames.paintBoundingRectangle(2);
-    mWindowPanelPixmap = frames.paintBoundingRectangle(1);
+    mBackground.makeFrames();
     Q_EMIT titlerWindowGeometry(geometry());
     QMainWindow::resizeEvent(event);
 }
@@ -375,15 +244,548 @@ void TitlerWindow::hideEvent(QHideEvent* event)
     WINDOW_IS_SHOWN = false;
     if (!event->spontaneous()) {
         // Whoever asked for a mask may take it away only later, or never.
-        showDialogMaskWidget(false);
-        showMessageMaskWidget(false);
-        if (mInputContext)
-            mInputContext->setWindowID(winId());
+        slotShowDialogMaskWidget(false);
+        slotShowMessageMaskWidget(false);
+        if (KSInputContext* context = mLinks->inputContext())
+            context->setWindowID(winId());
     }
     QMainWindow::hideEvent(event);
 }
 
-bool TitlerWindow::windowIsVisible() const
+// A window manager's close is the operator's Close: the process lives on.
+void TitlerWindow::closeEvent(QCloseEvent* event)
 {
-    return WINDOW_IS_SHOWN;
+    if (mSessionEnd.closesWindow()) {
+        QMainWindow::closeEvent(event);
+        QCoreApplication::quit();
+        return;
+    }
+    event->ignore();
+    closeTitlerWindow();
+}
+
+void TitlerWindow::mousePressEvent(QMouseEvent* event)
+{
+    QWidget* child = childAt(mapFromGlobal(QCursor::pos()));
+    QString places;
+    QDebug(&places) << "#POS#:" << child << QCursor::pos() << event->position() << event->globalPosition();
+    LOG_DEBUG_OPERATE(L"TitlerWindow", 200, places.toStdWString());
+    if (TEXT_PROPERTY_RECT.contains(mapFromGlobal(event->globalPosition().toPoint()))) {
+        QMainWindow::mousePressEvent(event);
+        QMainWindow::mousePressEvent(event);
+        return;
+    }
+    if (!isGraphicsView(child))
+        hideSoftWareWithDeleteEmptyItems();
+    QMainWindow::mousePressEvent(event);
+}
+
+bool TitlerWindow::eventFilter(QObject* obj, QEvent* event)
+{
+    if (mArchiveList->getMoveState())
+        return false;
+    if (ignoreMouseAndTouchEventWhenArchiveListIsMoveMode(obj, event))
+        return true;
+    switch (event->type()) {
+    case QEvent::MouseButtonPress:
+    case QEvent::TouchBegin:
+        if (qobject_cast<QMenu*>(obj))
+            return false;
+        mArchiveList->clearOperationItemState(mArchiveList->getCurrentOperationArchive());
+        break;
+    case QEvent::MouseButtonRelease:
+        if (obj == mArchiveList)
+            hideSoftWareWithOutDeleteEmptyItems();
+        break;
+    default:
+        break;
+    }
+    return ignoreTouchEventWhenSliderIsShowing(obj, event);
+}
+
+// While the slider of the edge is open, fingers work nothing else.
+bool TitlerWindow::ignoreTouchEventWhenSliderIsShowing(QObject* obj, QEvent* event) const
+{
+    switch (event->type()) {
+    case QEvent::TouchBegin:
+    case QEvent::TouchUpdate:
+    case QEvent::TouchEnd:
+        return obj && !qobject_cast<QSlider*>(obj) && mTextToolsPanel->edgeSliderIsShown();
+    default:
+        return false;
+    }
+}
+
+bool TitlerWindow::ignoreMouseAndTouchEventWhenArchiveListIsMoveMode(QObject* obj, QEvent* event)
+{
+    if (!mMoveMode->isEndedBy(obj, event, mArchiveList))
+        return false;
+    slotCancelArchiveListMoveMode();
+    if (event->type() == QEvent::TouchBegin)
+        slotCancelArchiveListMoveMode(); // siblings hear of a finger twice
+    return true;
+}
+
+// --- A session, from the request to the answer -----------------------------------------------------------
+
+void TitlerWindow::showTitlerWindow(titler_paramter paramter)
+{
+    if (!isHidden())
+        return;
+    mUnsavedWork.takeQuestion();
+    show();
+    activateWindow();
+    raise();
+    mLinks->changeTopWindow(MessageDefine::TOP_WINDOW_TITLER);
+    mLinks->setMessageMainWindow(this);
+    mCanvasScene->setModuleInfo(m_emModuleInfo);
+    mTextToolsPanel->setModuleInfo(m_emModuleInfo);
+    mTextToolsPanel->initTextToolsPanel();
+    mTemplatePicker->setModuleInfo(m_emModuleInfo);
+
+    mToolsBar->setFolderButtonEnabled(true);
+    mDialogs->initFolderPicker();
+    beginSession(paramter);
+
+    if (const std::optional<QString> font = std::exchange(mMissingFont, std::nullopt))
+        mLinks->postMessage(MessageDef::MESSAGE_FONT_MISSING, *font);
+    mLinks->getInputLanguage();
+    changeFontComboxItem(m_emModuleInfo);
+}
+
+void TitlerWindow::beginSession(const titler_paramter& parameter)
+{
+    mSessionEnd.beginSession(parameter.mode == _titler_paramter::CREATE_OR_EDIT);
+    if (parameter.mode == _titler_paramter::CREATE_OR_EDIT) {
+        mToolsBar->setFolderButtonEnabled(false);
+        mFolderPicker->setDuplicateButtonEnabled(false);
+        mFolderPicker->setCreateFolderButtonEnabled(false);
+        refreshArchiveList(QString::fromStdWString(parameter.path));
+    } else if (parameter.mode == _titler_paramter::SUB_PANEL) {
+        EditContextController::getInstance()->setITitlerNoCallBack();
+        mFolderPicker->updateTreeView();
+        showFolderDialog();
+    }
+}
+
+void TitlerWindow::refreshArchiveList(QString path)
+{
+    if (path.isEmpty()) {
+        mFolderPicker->updateTreeView();
+        showFolderDialog();
+        return;
+    }
+    const QFileInfo info(path);
+    const qsizetype slash = path.lastIndexOf(QLatin1Char('/'));
+    if (!info.exists()) {
+        hide();
+    } else if (!isBelowTitles(path) || (!info.isDir() && !isBelowTitles(path.left(slash)))) {
+        logRefusedRequest(path);
+        hide(); // as for a path that does not exist
+    } else if (info.isDir()) {
+        mArchiveList->refreshArchiveList(path);
+    } else {
+        mArchiveList->refreshArchiveListInFile(path.left(slash), path.mid(slash + 1));
+    }
+    markOpenFolder();
+}
+
+void TitlerWindow::closeTitlerWindow()
+{
+    mArchiveList->stopArchiveListTapAndHoldTimer();
+    if (archiveListIsMoveMode())
+        slotCancelArchiveListMoveMode(); // what is being dragged gets its place while the folder is open
+    mArchiveList->slotHideOptionMenu();
+    const QString path = mArchiveList->getCurrentPath();
+    saveCurrentTitle();
+    clearUndoStack();
+    mTextToolsPanel->setSignalValue(false);
+    mArchiveList->synchronizationFolderFile();
+    mTextToolsPanel->initTextToolsPanel();
+    mLinks->editFolderEnds(path);
+    mToolsBar->resetToDefaultState();
+    resetCanvasBackground();
+    waitUntilSaved();
+    if (mUnsavedWork.ask(*mLinks))
+        return; // continueCloseTitler follows with the answer
+
+    EditContextController* context = EditContextController::getInstance();
+    if (mSessionEnd.asksFirst() && context->isMainNeedMsg()) {
+        mLinks->postMessage(MessageDef::MESSAGE_CONFIRM_CLOSE);
+        context->setITitlerNoCallBack();
+        return;
+    }
+    closeTitlerMainWindow();
+}
+
+void TitlerWindow::resetCanvasBackground()
+{
+    QAction checker(nullptr);
+    checker.setData(CANVAS_CHECKER);
+    mCanvasScene->slotShowCanvasBG(&checker);
+}
+
+void TitlerWindow::closeTitlerMainWindow()
+{
+    const QString path = mArchiveList->getCurrentPath();
+    if (mSessionEnd.closesWindow())
+        close();
+    else
+        hideSession();
+    mDialogs->takeOpenedFromEditor();
+    mLinks->simpleCloseSoftKeyboard();
+    EditContextController::getInstance()->sentITitlerCallBack(path.toStdWString());
+    EditContextController::getInstance()->setITitlerNoCallBack();
+    mLinks->changeTopWindow(MessageDefine::TOP_WINDOW_MAIN);
+    // All files are in their place; the disk may take longer, but nobody waits for it.
+    QTimer::singleShot(SYNC_DEADLINE, this, &UnsavedWork::logUnsynced);
+}
+
+void TitlerWindow::hideSession()
+{
+    mTemplatePicker->reject(); // an answered message may come while it is open
+    mFolderPicker->setCurrentFolderName(QString());
+    mToolsBar->hideCanvasMenu(); // a window of its own
+    hide();
+    mCanvasScene->clearCanvas();
+    mArchiveList->cleanArchiveList();
+    mArchiveList->clearCopyArchive();
+}
+
+void TitlerWindow::continueCloseTitler(MessageDefine::tagCloseParam param)
+{
+    if (isHidden() || param.messageId != MessageDef::MESSAGE_CONFIRM_CLOSE)
+        return;
+    if (mUnsavedWork.takeQuestion()) {
+        if (param.closeType != MessageDefine::CLOSE_OK) {
+            // The session continues, but the siblings have been told that the folder is free.
+            mLinks->editFolderStarts(mArchiveList->getCurrentPath());
+            return;
+        }
+        UnsavedWork::giveUp();
+    }
+    closeTitlerMainWindow();
+}
+
+bool TitlerWindow::dataSaveIsFinished()
+{
+    return mCanvasScene->isEditFinish();
+}
+
+void TitlerWindow::waitUntilSaved()
+{
+    if (!dataSaveIsFinished()) {
+        if (isVisible())
+            mSavingNotice->showAtOnce();
+        if (!mCanvasScene->waitForPictures())
+            LOG_DEBUG_OPERATE(L"TitlerWindow", LOG_NUMBER, L"pictures are still being written");
+        mSavingNotice->hide();
+    }
+    // The thread that writes the pictures reports them by way of this thread's events. Siblings hear of them
+    // before they hear of what follows, and before the process is gone.
+    mLinks->sendTitleReports();
+}
+
+void TitlerWindow::saveCurrentTitle()
+{
+    mGraphicsView->cancelTouch(); // an object that is being dragged is saved at its old place
+    mCanvasScene->leaveTitle();
+}
+
+void TitlerWindow::endProcess()
+{
+    if (!mSessionEnd.beginEndOfProcess())
+        return;
+    mFolderPicker->done(QDialog::Rejected); // a dialog with no Cancel would refuse the end
+    saveCurrentTitle();
+    waitUntilSaved();
+    UnsavedWork::giveUp();
+    if (!KSInputContext::isSoftKeyboardClosed())
+        mLinks->simpleCloseSoftKeyboard(); // it would stay up without this process
+    close();
+    QApplication::closeAllWindows();
+    QCoreApplication::quit();
+}
+
+// --- Dialogs --------------------------------------------------------------------------------------------
+
+void TitlerWindow::showFolderDialog()
+{
+    mDialogs->showFolderDialog();
+}
+
+void TitlerWindow::openFolderDialog()
+{
+    mArchiveList->stopArchiveListTapAndHoldTimer();
+    if (isHidden())
+        return;
+    mDialogs->noteOpenedFromEditor();
+    hideSoftWareWithDeleteEmptyItems();
+    mCanvasScene->slotMakeSceneThumnail();
+    mFolderPicker->setCancelButtonEnabled(!mArchiveList->isEmpty());
+    mArchiveList->synchronizationFolderFile();
+    clearUndoStack();
+    mFolderPicker->updateTreeView();
+    markOpenFolder();
+    showFolderDialog();
+    mToolsBar->setFolderButtonRest();
+}
+
+// The folder that is open cannot take a new name in the picker, and renames by others are followed.
+void TitlerWindow::markOpenFolder()
+{
+    mFolderPicker->setCurrentFolderName(
+        mArchiveList->getCurrentPath().section(QLatin1Char('/'), -1, -1, QString::SectionSkipEmpty));
+}
+
+void TitlerWindow::slotCancelClicked()
+{
+    if (!mDialogs->takeOpenedFromEditor()) {
+        if (mSessionEnd.closesWindow()) {
+            close();
+        } else {
+            mFolderPicker->setCurrentFolderName(QString());
+            hide();
+            mLinks->simpleCloseSoftKeyboard();
+        }
+    }
+    if (WINDOW_IS_SHOWN)
+        return;
+    EditContextController::getInstance()->setITitlerNoCallBack();
+    mLinks->changeTopWindow(MessageDefine::TOP_WINDOW_MAIN);
+    mLinks->editFolderEnds(mArchiveList->getCurrentPath());
+}
+
+void TitlerWindow::showTemplateDialog()
+{
+    mDialogs->showTemplateDialog();
+}
+
+void TitlerWindow::showTemplateDialogOnUser()
+{
+    mTemplatePicker->showUserTemplateTab();
+    showTemplateDialog();
+}
+
+void TitlerWindow::slotStartCreateNewArchiveFromTemplate(Archive* archiveData)
+{
+    mArchiveList->createArchiveFromTemplate(archiveData);
+    mCanvasScene->createThumnailPicture();
+}
+
+void TitlerWindow::slotShowDialogMaskWidget(bool isShow)
+{
+    if (!isShow || WINDOW_IS_SHOWN)
+        mMasks->showDialogMaskWidget(isShow);
+}
+
+void TitlerWindow::slotShowMessageMaskWidget(bool isShow)
+{
+    if (!isShow || WINDOW_IS_SHOWN)
+        mMasks->showMessageMaskWidget(isShow);
+}
+
+// --- Undo, and what the canvas and the list are asked for --------------------------------------------------
+
+// A change of the selected title at a clean stack leaves the stack clean.
+void TitlerWindow::pushUndoStack(QUndoCommand* subUndoCommand)
+{
+    if (mUndoStack.isClean() && subUndoCommand->id() == FOCUS_COMMAND_ID) {
+        delete subUndoCommand;
+        return;
+    }
+    mUndoStack.push(subUndoCommand);
+}
+
+void TitlerWindow::clearUndoStack()
+{
+    mUndoStack.clear();
+    if (ArchiveItem* item = mArchiveList->getCurrentOperationArchive())
+        mArchiveList->clearOperationItemState(item);
+}
+
+void TitlerWindow::slotStartPasteArchive()
+{
+    mCanvasScene->createThumnailPicture();
+}
+
+void TitlerWindow::slotNewTextButtonClicked()
+{
+    mCanvasScene->slotInsertNewTextItem();
+}
+
+void TitlerWindow::pressDelectButton()
+{
+    mCanvasScene->deleteSelectedItems();
+    mLinks->dummyCloseSoftKeyboard();
+}
+
+// The checker shows the window's own picture behind the canvas.
+void TitlerWindow::slotCanvasButtonClicked(QAction*)
+{
+    update();
+}
+
+void TitlerWindow::setHasMessageToShowInformation(bool isNeedShow, QString defaultFont)
+{
+    mMissingFont = isNeedShow ? std::optional(std::move(defaultFont)) : std::nullopt;
+}
+
+// --- Leaving text editing --------------------------------------------------------------------------------
+
+void TitlerWindow::leaveTextEditing(bool deleteEmptyItems)
+{
+    const bool isEditing = mCanvasScene->itemIsEditorInteraction();
+    if (isEditing || mCanvasScene->itemIsSelectionMode()) {
+        if (isEditing)
+            mCanvasScene->clearItemsSelectionAndFocus();
+        else
+            mCanvasScene->clearItemsSelectionMode();
+        if (deleteEmptyItems)
+            slotDeleteEmptyItems();
+        mCanvasScene->disableTextPropertyArea();
+        if (isEditing && deleteEmptyItems)
+            LOG_DEBUG_OPERATE(L"TitlerWindow", 200, L"hideSoftWareWithDeleteEmptyItems");
+    }
+    mLinks->dummyCloseSoftKeyboard();
+}
+
+void TitlerWindow::slotDeleteEmptyItems()
+{
+    // Over the canvas lies the viewport of its view: a tap beside a text that was left empty takes that away.
+    if (!qobject_cast<QGraphicsView*>(QApplication::widgetAt(QCursor::pos())))
+        mCanvasScene->slotDeleteEmptyItems();
+}
+
+// --- Move mode ------------------------------------------------------------------------------------------
+
+bool TitlerWindow::archiveListIsMoveMode() const
+{
+    return mMoveMode->isOn();
+}
+
+void TitlerWindow::editAndDoneButtonClicked()
+{
+    // What is being composed goes into the text before that is left.
+    if (KSInputContext* context = mLinks->inputContext())
+        context->sendEvent(QInputMethodEvent());
+    KSPushbutton* button = mMoveMode->button();
+    button->setStyleSheet(button->styleSheet());
+    const bool on = !archiveListIsMoveMode();
+    sendTransientControlEvent(on);
+    changeMoveMode(on);
+}
+
+void TitlerWindow::changeMoveMode(bool on)
+{
+    mMoveMode->setOn(on);
+    Q_EMIT moveButtonClicked(on);
+}
+
+void TitlerWindow::slotChangeDoneToMoveMode()
+{
+    if (archiveListIsMoveMode())
+        editAndDoneButtonClicked();
+}
+
+void TitlerWindow::slotCancelArchiveListMoveMode()
+{
+    reportHiddenControl();
+    changeMoveMode(false);
+}
+
+void TitlerWindow::moveButtonPressed()
+{
+    mMoveMode->showPressed();
+}
+
+void TitlerWindow::moveButtonReleased()
+{
+    mMoveMode->showReleased();
+}
+
+// --- Lock reporting -------------------------------------------------------------------------------------
+
+// Reports to the siblings that a control which closes on a press elsewhere is open, or closed again.
+void TitlerWindow::sendTransientControlEvent(bool on)
+{
+    mLinks->sendAPPEvent(APPEventDefine::LOCKTYPE_OBJECT, on);
+}
+
+void TitlerWindow::reportHiddenControl()
+{
+    if (WINDOW_IS_SHOWN)
+        sendTransientControlEvent(false);
+}
+
+void TitlerWindow::slotHideEdgeSlider()
+{
+    mTextToolsPanel->hideEdgeSlider();
+    reportHiddenControl();
+}
+
+void TitlerWindow::slotHideCanvasMenu()
+{
+    mToolsBar->hideCanvasMenu();
+    reportHiddenControl();
+}
+
+void TitlerWindow::slotHideFontFamilyComboxList()
+{
+    mTextToolsPanel->hideFontFamilyComboxList();
+    reportHiddenControl();
+}
+
+void TitlerWindow::slotHideFontSizeComboxList()
+{
+    mTextToolsPanel->hideFontSizeComboxList();
+    reportHiddenControl();
+}
+
+// --- Language and module --------------------------------------------------------------------------------
+
+void TitlerWindow::slotSystemLanguageChanged(SystemSetupDef::emSystemLanguageType systemLanguage)
+{
+    if (mLanguage.switchTranslator(systemLanguage))
+        retranslateUI();
+    useSpecifiedFont(WindowLanguage::fontFamily(systemLanguage));
+    mTemplatePicker->reloadTemplates(systemLanguage);
+}
+
+void TitlerWindow::slotInputLanguageChanged(SystemSetupDef::emInputLanguageType inputLanguage)
+{
+    mCanvasScene->slotSceneInputLanguageChanged(inputLanguage);
+    mTextToolsPanel->displayInputLanguage(inputLanguage);
+}
+
+void TitlerWindow::slotGetModuleInfo(SystemSetupDef::emInformationModel moduleInfo)
+{
+    m_emModuleInfo = moduleInfo;
+    mCanvasScene->setModuleInfo(moduleInfo);
+    mTextToolsPanel->setModuleInfo(moduleInfo);
+    mTemplatePicker->setModuleInfo(moduleInfo);
+}
+
+void TitlerWindow::retranslateUI()
+{
+    setWindowTitle(tr("Titler"));
+    mMoveMode->translateText();
+    mTextToolsPanel->translateText();
+    mToolsBar->translateText();
+    mFolderPicker->translateText();
+    mArchiveList->translateText();
+    mTemplatePicker->translateText();
+}
+
+void TitlerWindow::useSpecifiedFont(const QString& family)
+{
+    mFolderPicker->setSystemLanFont(QFont(family));
+    setStyleSheet(QStringLiteral(" * {font-family:'%1';}").arg(family));
+    mArchiveList->setSystemLanFont(family);
+    mTemplatePicker->setSystemLanFont(QFont(family));
+}
+
+void TitlerWindow::changeFontComboxItem(SystemSetupDef::emInformationModel moduleInfo)
+{
+    Q_EMIT modifyFontComboxItem(moduleInfo != SystemSetupDef::emInformationModelChina);
 }

@@ -7,14 +7,18 @@
 #pragma once
 
 #include <QMainWindow>
-#include <QPixmap>
 #include <QPoint>
 #include <QRect>
 #include <QString>
 #include <QUndoStack>
 #include <memory>
+#include <optional>
 
+#include "app/SessionEnd.h"
 #include "app/TitlerParamter.h"
+#include "app/UnsavedWork.h"
+#include "app/WindowBackground.h"
+#include "app/WindowLanguage.h"
 #include "canvas/ICanvasHost.h"
 #include "messaging/services/MessageDefine.h"
 #include "messaging/services/SystemSetupDef.h"
@@ -22,31 +26,20 @@
 class Archive;
 class ArchiveList;
 class CanvasScene;
-class EditContextController;
-class EditTitlerController;
 class FolderPicker;
 class GraphicsView;
-class ISoftKeyBoardController;
 class KSBaseItemWidget;
-class KSInputContext;
-class KSPushbutton;
 class KSScrollViewerWidget;
+class MoveMode;
 class QAction;
-class QLabel;
-class QPushButton;
-class QTranslator;
 class QUndoCommand;
 class SavingNotice;
-class ShowMessageController;
-class ShowTitlerController;
-class SystemSetupInfoController;
-class TextToolsPanel;
+class SiblingLinks;
 class TemplatePicker;
-class TitlerAPPEventFilterController;
-class TitlerPowerController;
-class TitlerProjectDataController;
-class TitlerToolFactory;
+class TextToolsPanel;
 class ToolsBar;
+class WindowDialogs;
+class WindowMasks;
 
 class TitlerWindow : public QMainWindow, public ICanvasHost
 {
@@ -67,9 +60,9 @@ public:
     TitlerWindow(bool deferArchiveList, QWidget* parent);
     ~TitlerWindow() override;
 
-    bool windowIsVisible() const override;
+    bool windowIsVisible() const override { return WINDOW_IS_SHOWN; }
 
-    // Whether nothing of the canvas is still on its way to disk.
+    // Returns whether nothing of the canvas is still on its way to disk.
     bool dataSaveIsFinished();
 
     // Puts what is being edited on its way to disk, as leaving the title does.
@@ -90,8 +83,8 @@ public Q_SLOTS:
     void closeTitlerWindow();
     void continueCloseTitler(MessageDefine::tagCloseParam param);
     void closeTitlerMainWindow();
-    void slotPowerOff();
-    void setRealClose(bool realClose);
+    void slotPowerOff() { endProcess(); }
+    void setRealClose(bool realClose) { mSessionEnd.setQuits(realClose); }
     // Saves, waits until all is written, and ends the event loop.
     void endProcess();
 
@@ -113,8 +106,8 @@ public Q_SLOTS:
     void clearUndoStack();
 
     // Leaving text editing.
-    void hideSoftWareWithDeleteEmptyItems();
-    void hideSoftWareWithOutDeleteEmptyItems();
+    void hideSoftWareWithDeleteEmptyItems() { leaveTextEditing(true); }
+    void hideSoftWareWithOutDeleteEmptyItems() { leaveTextEditing(false); }
     void slotDeleteEmptyItems();
 
     // Move mode.
@@ -135,14 +128,17 @@ public Q_SLOTS:
     void slotCanvasButtonClicked(QAction* action);
     void slotStartPasteArchive();
     void slotStartCreateNewArchiveFromTemplate(Archive* archiveData);
-    void listWidgetReleasedEvent(KSBaseItemWidget* item, QPoint point, KSScrollViewerWidget* viewer);
+    void listWidgetReleasedEvent(KSBaseItemWidget*, QPoint, KSScrollViewerWidget*)
+    {
+        hideSoftWareWithOutDeleteEmptyItems();
+    }
     void setHasMessageToShowInformation(bool isNeedShow, QString defaultFont);
 
-    // Lock reporting.
-    void slotShowEdgeSlider(bool isShow);
-    void slotShowCanvasMenu(bool isShow);
-    void slotShowFontFamilyComboxList(bool isShow);
-    void slotShowFontSizeComboxList(bool isShow);
+    // Lock reporting. The siblings hear of controls that close on a press elsewhere.
+    void slotShowEdgeSlider(bool isShow) { sendTransientControlEvent(isShow); }
+    void slotShowCanvasMenu(bool isShow) { sendTransientControlEvent(isShow); }
+    void slotShowFontFamilyComboxList(bool isShow) { sendTransientControlEvent(isShow); }
+    void slotShowFontSizeComboxList(bool isShow) { sendTransientControlEvent(isShow); }
     void slotHideEdgeSlider();
     void slotHideCanvasMenu();
     void slotHideFontFamilyComboxList();
@@ -161,16 +157,12 @@ protected:
 
 private:
     void setAppDefaultParameter();
-    void initWindowWidget();
+    void initWindowWidget(bool deferArchiveList);
     void createToolsBar();
     void createCanvasScene();
-    void createArchiveList();
+    QWidget* createArchiveList(bool deferArchiveList);
     void createTextToolsPanel();
-    QWidget* createLeftColumn();
-    QLayout* createRightColumn();
     void initChildWindows();
-    void initProcessFactory();
-    void initProcessCommunications();
 
     void connectWidget();
     void connectForToolsBar();
@@ -179,12 +171,11 @@ private:
     void connectForTextToolsPanel();
     void connectForUndoRedoCommand();
     void connectForController();
+    void connectForRestoreOriginal();
     void connectForTemplates();
     void connectForTemplateNotices();
     void connectForFolderPicker();
     void connectForFolderNotices();
-    void initFolderPicker();
-    void markOpenFolder();
 
     bool ignoreMouseAndTouchEventWhenArchiveListIsMoveMode(QObject* obj, QEvent* event);
     bool ignoreTouchEventWhenSliderIsShowing(QObject* obj, QEvent* event) const;
@@ -192,76 +183,38 @@ private:
     void changeMoveMode(bool on);
     void sendTransientControlEvent(bool on);
     void reportHiddenControl();
-
-    bool asksAboutUnsavedWork();
-    void giveUpUnsavedWork();
-    void logUnsynced();
-
-    void setOpacityMaskVisible(bool visible);
-    void showDialogMaskWidget(bool show);
-    void showMessageMaskWidget(bool show);
-    QWidget* createMask() const;
-    void refuseRequest(const QString& path);
-
-    void switchTranslator(SystemSetupDef::emSystemLanguageType type);
-    void useSpecifiedFont(SystemSetupDef::emSystemLanguageType type);
-    void retranslateUI();
-    void changeFontComboxItem(SystemSetupDef::emInformationModel moduleInfo);
-    void drawCanvasSceneBG(QPainter& painter);
+    void beginSession(const titler_paramter& parameter);
+    void markOpenFolder();
+    void hideSession();
     void resetCanvasBackground();
-
-    // What the operator is being asked about the end of the session.
-    enum class Question { None, LoseUnsavedWork };
+    void retranslateUI();
+    void useSpecifiedFont(const QString& family);
+    void changeFontComboxItem(SystemSetupDef::emInformationModel moduleInfo);
 
     static bool WINDOW_IS_SHOWN;
 
-    // Visible objects; Qt parents own them, the undo stack is the window's own.
+    // Owned by Qt parents.
     ToolsBar* mToolsBar = nullptr;
     CanvasScene* mCanvasScene = nullptr;
     GraphicsView* mGraphicsView = nullptr;
     ArchiveList* mArchiveList = nullptr;
-    QLabel* mPathLabel = nullptr;
-    QPushButton* mFolderIcon = nullptr;
     TextToolsPanel* mTextToolsPanel = nullptr;
-    KSPushbutton* mMoveButton = nullptr;
-    QUndoStack mUndoStack;
-    QWidget* mOpacityMask = nullptr;
     SavingNotice* mSavingNotice = nullptr;
     FolderPicker* mFolderPicker = nullptr;
     TemplatePicker* mTemplatePicker = nullptr;
-    QWidget* mMessageMask = nullptr;
-    QWidget* mDialogMask = nullptr;
-    QTranslator* mTranslator = nullptr;
 
-    std::unique_ptr<TitlerToolFactory> mFactory;
-    KSInputContext* mInputContext = nullptr;                    // owned by the platform integration
-    ISoftKeyBoardController* mSoftKeyBoardController = nullptr; // owned by the factory
+    QUndoStack mUndoStack;
+    std::unique_ptr<SiblingLinks> mLinks;
+    std::unique_ptr<MoveMode> mMoveMode;
+    std::unique_ptr<WindowMasks> mMasks;
+    std::unique_ptr<WindowDialogs> mDialogs;
+    WindowBackground mBackground;
+    WindowLanguage mLanguage;
 
-    // Singletons; each owns itself until the destructor clears it.
-    EditContextController* mEditContextController = nullptr;
-    ShowTitlerController* mShowTitlerController = nullptr;
-    SystemSetupInfoController* mSystemSetupInfoController = nullptr;
-    EditTitlerController* mEditTitlerController = nullptr;
-    ShowMessageController* mShowMessageController = nullptr;
-    TitlerPowerController* mTitlerPowerController = nullptr;
-    TitlerProjectDataController* mTitlerProjectDataController = nullptr;
-    TitlerAPPEventFilterController* mTitlerAPPEventFilterController = nullptr;
-
-    QPixmap mLeftPanelPixmap;
-    QPixmap mWindowPanelPixmap;
-    QPixmap mCanvasPixmap;
-
-    Question mQuestion = Question::None;
-    bool m_bDeferArchiveList;
-    bool m_bRealClose = true;
-    bool m_bFolderDialogFromWindow = false;
-    bool m_bMoveModeOff = true;
-    bool m_bHasMessage = false;
-    bool m_bEditByMain = false;
-    bool m_bEnding = false;
-    QString m_strMessage;
+    SessionEnd mSessionEnd;
+    UnsavedWork mUnsavedWork;
+    std::optional<QString> mMissingFont; // to be reported when the window shows
     SystemSetupDef::emInformationModel m_emModuleInfo = SystemSetupDef::emInformationModelDefault;
-    QString m_strTranslationPath;
 };
 
 // The one main window; null before it is built and after it is deleted.

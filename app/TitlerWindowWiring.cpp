@@ -4,8 +4,10 @@
 
 #include "app/EditContextController.h"
 #include "app/EditTitlerController.h"
+#include "app/MoveMode.h"
 #include "app/ShowMessageController.h"
 #include "app/ShowTitlerController.h"
+#include "app/SiblingLinks.h"
 #include "app/SystemSetupInfoController.h"
 #include "app/TitlerAPPEventFilterController.h"
 #include "app/TitlerPowerController.h"
@@ -13,6 +15,8 @@
 #include "canvas/CanvasScene.h"
 #include "library/ArchiveItem.h"
 #include "library/ArchiveList.h"
+#include "library/FolderPicker.h"
+#include "library/TemplatePicker.h"
 #include "panel/TextToolsPanel.h"
 #include "touchui/KSPushbutton.h"
 
@@ -76,7 +80,8 @@ void TitlerWindow::connectForTextToolsAndArchiveList()
     connect(mArchiveList, &ArchiveList::archiveListMenuShow, this,
             &TitlerWindow::hideSoftWareWithDeleteEmptyItems);
     connect(mArchiveList, &ArchiveList::widgetItemReleased, this, &TitlerWindow::listWidgetReleasedEvent);
-    connect(mMoveButton, &QPushButton::clicked, this, &TitlerWindow::hideSoftWareWithDeleteEmptyItems);
+    connect(mMoveMode->button(), &QPushButton::clicked, this,
+            &TitlerWindow::hideSoftWareWithDeleteEmptyItems);
 }
 
 void TitlerWindow::connectForTextToolsPanel()
@@ -114,6 +119,27 @@ void TitlerWindow::connectForTextToolsPanel()
             &TextToolsPanel::titlerWindowRectSlot);
 }
 
+void TitlerWindow::connectForTemplates()
+{
+    connect(mTemplatePicker, &TemplatePicker::selectedTemplate, this,
+            &TitlerWindow::slotStartCreateNewArchiveFromTemplate);
+    connect(mTemplatePicker, &TemplatePicker::signalCloseSoftwareKeyBoardForFileManager, mFolderPicker,
+            &FolderPicker::slotCloseSoftwareKeyBoardForFileManager);
+    connect(mArchiveList, &ArchiveList::addUserSignal, mTemplatePicker, &TemplatePicker::slotSaveAsTemplate);
+}
+
+void TitlerWindow::connectForFolderPicker()
+{
+    connect(mFolderPicker, &FolderPicker::clearUndoCommandStack, this, &TitlerWindow::clearUndoStack);
+    connect(mFolderPicker, &FolderPicker::signalCancelClicked, this, &TitlerWindow::slotCancelClicked);
+    connect(mFolderPicker, &FolderPicker::changeFolderPath, mArchiveList, &ArchiveList::refreshArchiveList);
+    connect(mFolderPicker, &FolderPicker::changeFolderFile, mArchiveList,
+            &ArchiveList::refreshArchiveListInFile);
+    connect(mFolderPicker, &FolderPicker::folderNameChange, mArchiveList,
+            &ArchiveList::refreshArchiveListForChangeFolderName);
+    connect(mFolderPicker, &FolderPicker::folderMoved, mCanvasScene, &CanvasScene::folderRenamed);
+}
+
 void TitlerWindow::connectForUndoRedoCommand()
 {
     connect(mArchiveList, &ArchiveList::deleteCommandSignal, this, &TitlerWindow::pushUndoStack);
@@ -125,39 +151,61 @@ void TitlerWindow::connectForUndoRedoCommand()
 
 void TitlerWindow::connectForController()
 {
-    if (!mFactory)
+    if (!mLinks->areMade())
         return;
-    mEditContextController = EditContextController::getInstance();
-    connect(mShowTitlerController, &ShowTitlerController::signalShowTitlerParameter, this,
+    connect(ShowTitlerController::getInstance(), &ShowTitlerController::signalShowTitlerParameter, this,
             &TitlerWindow::showTitlerWindow);
-    connect(mEditContextController, &EditContextController::signalShowTitlerParameter, this,
+    connect(EditContextController::getInstance(), &EditContextController::signalShowTitlerParameter, this,
             &TitlerWindow::showTitlerWindow);
-    connect(mSystemSetupInfoController, &SystemSetupInfoController::signalsInputLanguageInfo, this,
+    const auto* setup = SystemSetupInfoController::getInstance();
+    connect(setup, &SystemSetupInfoController::signalsInputLanguageInfo, this,
             &TitlerWindow::slotInputLanguageChanged);
-    connect(mSystemSetupInfoController, &SystemSetupInfoController::signalsSystemLanguageInfo, this,
+    connect(setup, &SystemSetupInfoController::signalsSystemLanguageInfo, this,
             &TitlerWindow::slotSystemLanguageChanged);
-    connect(mSystemSetupInfoController, &SystemSetupInfoController::signalsSystemInfo, this,
-            &TitlerWindow::slotGetModuleInfo);
-    connect(mTitlerPowerController, &TitlerPowerController::signalPowerOff, this,
+    connect(setup, &SystemSetupInfoController::signalsSystemInfo, this, &TitlerWindow::slotGetModuleInfo);
+    connect(TitlerPowerController::getInstance(), &TitlerPowerController::signalPowerOff, this,
             &TitlerWindow::slotPowerOff);
-    connect(mTitlerAPPEventFilterController, &TitlerAPPEventFilterController::signalRestoreOriginal, this,
-            &TitlerWindow::slotCancelArchiveListMoveMode);
-    connect(mTitlerAPPEventFilterController, &TitlerAPPEventFilterController::signalRestoreOriginal, this,
-            &TitlerWindow::slotHideEdgeSlider);
-    connect(mTitlerAPPEventFilterController, &TitlerAPPEventFilterController::signalRestoreOriginal, this,
-            &TitlerWindow::slotHideCanvasMenu);
-    connect(mTitlerAPPEventFilterController, &TitlerAPPEventFilterController::signalRestoreOriginal, this,
-            &TitlerWindow::slotHideFontFamilyComboxList);
-    connect(mTitlerAPPEventFilterController, &TitlerAPPEventFilterController::signalRestoreOriginal, this,
-            &TitlerWindow::slotHideFontSizeComboxList);
-    connect(mEditTitlerController, &EditTitlerController::importNewFontFamilies, mTextToolsPanel,
-            &TextToolsPanel::slotImportNewFontFamlies);
+    connectForRestoreOriginal();
+    connect(EditTitlerController::getInstance(), &EditTitlerController::importNewFontFamilies,
+            mTextToolsPanel, &TextToolsPanel::slotImportNewFontFamlies);
     connectForFolderNotices();
     connect(MessageBoxController::getInstance(), &MessageBoxController::signalCloseMessage, this,
             &TitlerWindow::continueCloseTitler);
-    connect(mShowMessageController, &ShowMessageController::signalsShowDialogMaskWidget, this,
+    const auto* messages = ShowMessageController::getInstance();
+    connect(messages, &ShowMessageController::signalsShowDialogMaskWidget, this,
             &TitlerWindow::slotShowDialogMaskWidget);
-    connect(mShowMessageController, &ShowMessageController::signalsShowMessageMaskWidget, this,
+    connect(messages, &ShowMessageController::signalsShowMessageMaskWidget, this,
             &TitlerWindow::slotShowMessageMaskWidget);
     connectForTemplateNotices();
+}
+
+// A finger in another process closes what is open for the moment.
+void TitlerWindow::connectForRestoreOriginal()
+{
+    const auto* events = TitlerAPPEventFilterController::getInstance();
+    for (void (TitlerWindow::*restore)() :
+         {&TitlerWindow::slotCancelArchiveListMoveMode, &TitlerWindow::slotHideEdgeSlider,
+          &TitlerWindow::slotHideCanvasMenu, &TitlerWindow::slotHideFontFamilyComboxList,
+          &TitlerWindow::slotHideFontSizeComboxList})
+        connect(events, &TitlerAPPEventFilterController::signalRestoreOriginal, this, restore);
+}
+
+void TitlerWindow::connectForFolderNotices()
+{
+    const auto* fileManager = EditTitlerController::getInstance();
+    connect(fileManager, &EditTitlerController::folderNameChangeFromFileManager, mFolderPicker,
+            &FolderPicker::folderNameChanged);
+    connect(fileManager, &EditTitlerController::folderDeleteFromFileManager, mFolderPicker,
+            &FolderPicker::slotDeleteFolder);
+}
+
+void TitlerWindow::connectForTemplateNotices()
+{
+    const auto* fileManager = EditTitlerController::getInstance();
+    connect(fileManager, &EditTitlerController::importNewUserTemplate, mTemplatePicker,
+            &TemplatePicker::slotImportNewUserTemplate);
+    connect(fileManager, &EditTitlerController::deleteUserTemplate, mTemplatePicker,
+            &TemplatePicker::slotDeleteUserTemplate);
+    connect(fileManager, &EditTitlerController::renameUserTemplate, mTemplatePicker,
+            &TemplatePicker::slotRenameUserTemplate);
 }

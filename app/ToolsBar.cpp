@@ -4,6 +4,8 @@
 #include "canvas/DrawBoundingRectangle.h"
 #include "support/LogManager.h"
 #include "touchui/KSPushbutton.h"
+#include "touchui/NewLayout.h"
+#include "touchui/OutsidePressFilter.h"
 
 #include <QAction>
 #include <QBitmap>
@@ -12,7 +14,6 @@
 #include <QMenu>
 #include <QMouseEvent>
 #include <QPainter>
-#include <QTouchEvent>
 #include <QVBoxLayout>
 
 const QSize ToolsBar::BAR_ICON_SIZE(120, 67);
@@ -110,20 +111,20 @@ void ToolsBar::createMenu()
         m_menu->addAction(QString())->setData(i);
     }
     m_menu->setFixedSize(MENU_SIZE);
+    m_menuCursor = QPixmap(QStringLiteral(":/Menu/List_Cursor"));
+    m_menuSeparator = QPixmap(QStringLiteral(":/Separator_H"));
+    m_outsidePress = new OutsidePressFilter(m_menu, this);
+    connect(m_outsidePress, &OutsidePressFilter::pressedOutside, this, &ToolsBar::hideCanvasMenu);
 }
 
 void ToolsBar::createLayout()
 {
-    auto* undoGroup = new QHBoxLayout;
-    undoGroup->setContentsMargins(0, 0, 0, 0);
-    undoGroup->setSpacing(0);
+    auto* undoGroup = newLayout<QHBoxLayout>();
     undoGroup->addWidget(m_undo.button);
     undoGroup->addSpacing(BUTTON_SPACING);
     undoGroup->addWidget(m_redo.button);
 
-    auto* row = new QHBoxLayout;
-    row->setContentsMargins(0, 0, 0, 0);
-    row->setSpacing(0);
+    auto* row = newLayout<QHBoxLayout>();
     row->addSpacing(FIRST_SPACING);
     for (const ToolButton* tool : {&m_folder, &m_text, &m_delete}) {
         row->addWidget(tool->button);
@@ -136,10 +137,9 @@ void ToolsBar::createLayout()
     }
     row->addStretch();
 
-    auto* column = new QVBoxLayout(this);
-    column->setContentsMargins(0, 0, 0, 0);
-    column->setSpacing(0);
+    auto* column = newLayout<QVBoxLayout>();
     column->addLayout(row);
+    setLayout(column);
 }
 
 void ToolsBar::createConnection()
@@ -165,18 +165,10 @@ void ToolsBar::createConnection()
 
 void ToolsBar::connectLooks()
 {
-    const auto looks = [this](const ToolButton& tool, void (ToolsBar::*pressed)(),
-                              void (ToolsBar::*released)()) {
-        connect(tool.button, &QAbstractButton::pressed, this, pressed);
-        connect(tool.button, &QAbstractButton::released, this, released);
-    };
-    looks(m_folder, &ToolsBar::folderBtnPressed, &ToolsBar::folderBtnReleased);
-    looks(m_text, &ToolsBar::textBtnPressed, &ToolsBar::textBtnReleased);
-    looks(m_delete, &ToolsBar::deleteBtnPressed, &ToolsBar::deleteBtnReleased);
-    looks(m_undo, &ToolsBar::undoBtnPressed, &ToolsBar::undoBtnReleased);
-    looks(m_redo, &ToolsBar::redoBtnPressed, &ToolsBar::redoBtnReleased);
-    looks(m_safeArea, &ToolsBar::safeAreaBtnPressed, &ToolsBar::safeAreaBtnReleased);
-    looks(m_close, &ToolsBar::closeBtnPressed, &ToolsBar::closeBtnReleased);
+    for (const ToolButton* tool : {&m_folder, &m_text, &m_delete, &m_undo, &m_redo, &m_safeArea, &m_close}) {
+        connect(tool->button, &QAbstractButton::pressed, this, [this, tool] { showPressed(*tool); });
+        connect(tool->button, &QAbstractButton::released, this, [this, tool] { showReleased(*tool); });
+    }
 }
 
 void ToolsBar::translateText()
@@ -242,17 +234,17 @@ void ToolsBar::clickedSafeAreaButton()
 {
     logTap(L"Tap Safe Area Button");
     m_safeAreaShown = !m_safeAreaShown;
-    safeAreaBtnReleased();
+    showReleased(m_safeArea);
     Q_EMIT SafeAreaButtonClicked();
     Q_EMIT SafeAreaButtonClickedForDrawRect(m_safeAreaShown);
 }
 
-// What was drawn goes with the flag.
+// Also removes what was drawn on the canvas.
 void ToolsBar::resetSafeArea()
 {
     const bool wasShown = m_safeAreaShown;
     m_safeAreaShown = false;
-    safeAreaBtnReleased();
+    showReleased(m_safeArea);
     if (wasShown) {
         Q_EMIT SafeAreaButtonClickedForDrawRect(false);
     }
@@ -268,7 +260,7 @@ void ToolsBar::setToolEnabled(const ToolButton& tool, bool enabled)
         tool.button->setEnabled(true);
         tool.button->changeButtonState(KSPushbutton::ButtonRest);
     } else {
-        // What others hold is theirs: a step that is pushed by a timer disables Redo under whatever is
+        // Others keep their touches: a step that is pushed by a timer disables Redo while anything may be
         // touched.
         if (tool.button->isDown() || tool.button == m_text.button) {
             setPushButtonDisabled(tool.button);
@@ -341,76 +333,21 @@ void ToolsBar::slotlCanvasSceneMousePressed()
 
 // Looks.
 
-void ToolsBar::folderBtnPressed()
+bool ToolsBar::isSelected(const ToolButton& tool) const
 {
-    m_folder.button->changeButtonState(KSPushbutton::ButtonPressed);
+    return &tool == &m_safeArea && m_safeAreaShown;
 }
 
-void ToolsBar::folderBtnReleased()
+void ToolsBar::showPressed(const ToolButton& tool)
 {
-    m_folder.button->changeButtonState(KSPushbutton::ButtonRest);
+    tool.button->changeButtonState(isSelected(tool) ? KSPushbutton::ButtonSelectedPressed
+                                                    : KSPushbutton::ButtonPressed);
 }
 
-void ToolsBar::textBtnPressed()
+void ToolsBar::showReleased(const ToolButton& tool)
 {
-    m_text.button->changeButtonState(KSPushbutton::ButtonPressed);
-}
-
-void ToolsBar::textBtnReleased()
-{
-    m_text.button->changeButtonState(KSPushbutton::ButtonRest);
-}
-
-void ToolsBar::deleteBtnPressed()
-{
-    m_delete.button->changeButtonState(KSPushbutton::ButtonPressed);
-}
-
-void ToolsBar::deleteBtnReleased()
-{
-    m_delete.button->changeButtonState(KSPushbutton::ButtonRest);
-}
-
-void ToolsBar::undoBtnPressed()
-{
-    m_undo.button->changeButtonState(KSPushbutton::ButtonPressed);
-}
-
-void ToolsBar::undoBtnReleased()
-{
-    m_undo.button->changeButtonState(KSPushbutton::ButtonRest);
-}
-
-void ToolsBar::redoBtnPressed()
-{
-    m_redo.button->changeButtonState(KSPushbutton::ButtonPressed);
-}
-
-void ToolsBar::redoBtnReleased()
-{
-    m_redo.button->changeButtonState(KSPushbutton::ButtonRest);
-}
-
-void ToolsBar::safeAreaBtnPressed()
-{
-    m_safeArea.button->changeButtonState(m_safeAreaShown ? KSPushbutton::ButtonSelectedPressed
-                                                         : KSPushbutton::ButtonPressed);
-}
-
-void ToolsBar::safeAreaBtnReleased()
-{
-    m_safeArea.button->changeButtonState(m_safeAreaShown ? KSPushbutton::ButtonSelectedRest
-                                                         : KSPushbutton::ButtonRest);
-}
-
-void ToolsBar::closeBtnPressed()
-{
-    m_close.button->changeButtonState(KSPushbutton::ButtonPressed);
-}
-
-void ToolsBar::closeBtnReleased()
-{
-    m_close.button->changeButtonState(KSPushbutton::ButtonRest);
+    tool.button->changeButtonState(isSelected(tool) ? KSPushbutton::ButtonSelectedRest
+                                                    : KSPushbutton::ButtonRest);
 }
 
 // The Canvas menu.
@@ -437,54 +374,21 @@ void ToolsBar::hideCanvasMenu()
 
 void ToolsBar::canvasBtnSelected()
 {
+    m_outsidePress->start();
     m_canvas.button->changeButtonState(KSPushbutton::ButtonSelectedRest);
     Q_EMIT signalShowCanvasMenu(true);
 }
 
 void ToolsBar::canvasBtnReleased()
 {
+    m_outsidePress->stop();
     m_canvas.button->changeButtonState(KSPushbutton::ButtonRest);
     Q_EMIT signalShowCanvasMenu(false);
 }
 
 bool ToolsBar::eventFilter(QObject* obj, QEvent* event)
 {
-    if (obj == m_menu) {
-        return paintCanvasMenu(event);
-    }
-    return closeMenuByPress(obj, event);
-}
-
-bool ToolsBar::closeMenuByPress(QObject* obj, QEvent* event)
-{
-    switch (event->type()) {
-    case QEvent::TouchBegin:
-    case QEvent::MouseButtonPress:
-    case QEvent::MouseButtonDblClick: {
-        m_closingPress.clear();
-        const auto* press = static_cast<QPointerEvent*>(event);
-        if (!m_menu->isVisible() || !obj->isWidgetType() || press->points().isEmpty() ||
-            m_menu->geometry().contains(press->points().constFirst().globalPosition().toPoint())) {
-            return false;
-        }
-        m_menu->hide();
-        m_closingPress = obj;
-        return true;
-    }
-    case QEvent::TouchUpdate:
-    case QEvent::MouseMove:
-        return m_closingPress != nullptr && m_closingPress == obj;
-    case QEvent::TouchEnd:
-    case QEvent::TouchCancel:
-    case QEvent::MouseButtonRelease:
-        if (m_closingPress != nullptr && m_closingPress == obj) {
-            m_closingPress.clear();
-            return true;
-        }
-        return false;
-    default:
-        return false;
-    }
+    return obj == m_menu && paintCanvasMenu(event);
 }
 
 bool ToolsBar::paintCanvasMenu(QEvent* event)
@@ -576,8 +480,6 @@ int ToolsBar::cursorItem(const QPoint& point) const
 
 void ToolsBar::drawMenuItem(QPainter* painter)
 {
-    const QPixmap cursor(QStringLiteral(":/Menu/List_Cursor"));
-    const QPixmap separator(QStringLiteral(":/Separator_H"));
     QFont font = m_menu->font();
     font.setPixelSize(24);
     painter->setFont(font);
@@ -586,12 +488,12 @@ void ToolsBar::drawMenuItem(QPainter* painter)
     for (int i = 0; i < MENU_ITEMS; ++i) {
         const QRect area = getMenuItemRect(m_menu->rect(), i);
         if (i == m_menuItem) {
-            painter->drawPixmap(area, cursor);
+            painter->drawPixmap(area, m_menuCursor);
         }
         if (i > 0) {
-            painter->drawPixmap(
-                QRect(area.left(), area.top() - separator.height(), area.width(), separator.height()),
-                separator);
+            painter->drawPixmap(QRect(area.left(), area.top() - m_menuSeparator.height(), area.width(),
+                                      m_menuSeparator.height()),
+                                m_menuSeparator);
         }
         painter->drawText(area.adjusted(MENU_TEXT_INDENT, 0, 0, 0), Qt::AlignLeft | Qt::AlignVCenter,
                           actions.at(i)->text());

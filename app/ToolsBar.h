@@ -4,12 +4,12 @@
 #include <QIcon>
 #include <QPixmap>
 #include <QPoint>
-#include <QPointer>
 #include <QRect>
 #include <QSize>
 #include <QWidget>
 
 class KSPushbutton;
+class OutsidePressFilter;
 class QAction;
 class QHBoxLayout;
 class QLabel;
@@ -81,20 +81,6 @@ private Q_SLOTS:
     void showCanvasMenu();
     void canvasBtnSelected();
     void canvasBtnReleased();
-    void folderBtnPressed();
-    void folderBtnReleased();
-    void textBtnPressed();
-    void textBtnReleased();
-    void deleteBtnPressed();
-    void deleteBtnReleased();
-    void undoBtnPressed();
-    void undoBtnReleased();
-    void redoBtnPressed();
-    void redoBtnReleased();
-    void safeAreaBtnPressed();
-    void safeAreaBtnReleased();
-    void closeBtnPressed();
-    void closeBtnReleased();
 
 private:
     // A button with its label and pictures.
@@ -115,6 +101,10 @@ private:
     void setToolEnabled(const ToolButton& tool, bool enabled);
     void setPushButtonDisabled(QPushButton* button);
     void resetSafeArea();
+    // The looks under a finger and after it. The safe area stays selected while it is drawn.
+    void showPressed(const ToolButton& tool);
+    void showReleased(const ToolButton& tool);
+    bool isSelected(const ToolButton& tool) const;
 
     bool paintCanvasMenu(QEvent* event);
     void onMouseButtonPress(QMouseEvent* event);
@@ -124,7 +114,6 @@ private:
     void drawMenuItem(QPainter* painter);
     static QRect getMenuItemRect(const QRect& rect, int index);
     int cursorItem(const QPoint& point) const;
-    bool closeMenuByPress(QObject* obj, QEvent* event);
 
     QAction* m_undoAction;
     QAction* m_redoAction;
@@ -137,8 +126,10 @@ private:
     ToolButton m_canvas;
     ToolButton m_close;
     QMenu* m_menu = nullptr;
+    OutsidePressFilter* m_outsidePress = nullptr;
     QPixmap m_menuBackground;
+    QPixmap m_menuCursor;
+    QPixmap m_menuSeparator;
     int m_menuItem = -1; // under the finger
     bool m_safeAreaShown = false;
-    QPointer<QObject> m_closingPress; // took the touch or press that closed the menu
 };

@@ -1,24 +1,25 @@
 #include "library/ArchiveList.h"
 
+#include "canvas/CanvasScene.h"
 #include "canvas/SaveOutage.h"
 #include "document/Archive.h"
 #include "document/ArchiveController.h"
 #include "document/ArchiveOrder.h"
 #include "document/FolderOrder.h"
-#include "document/FolderTitles.h"
-#include "library/ArchiveCheckThread.h"
 #include "library/ArchiveInitThread.h"
 #include "library/ArchiveItem.h"
-#include "library/ArchiveMenu.h"
 #include "library/ArchiveRow.h"
 #include "library/FocusArchiveCommand.h"
+#include "library/IEditContext.h"
 #include "library/ITitlerFolderReporter.h"
 #include "library/ListMessages.h"
+#include "library/MoveArchiveCommand.h"
 #include "support/ConfinedPath.h"
 #include "support/FolderLookup.h"
 #include "support/IPathManagerEx.h"
 #include "support/LeftoverSweep.h"
 #include "support/LogManager.h"
+#include "support/SystemInfo.h"
 
 #include <QCoreApplication>
 #include <QDir>
@@ -26,6 +27,7 @@
 #include <QFile>
 #include <QFileInfo>
 #include <QLabel>
+#include <QWheelEvent>
 #include <algorithm>
 #include <string>
 #include <unordered_set>
@@ -35,16 +37,14 @@
 namespace
 {
 
-const int ITEMS_IN_VIEW = 6; // before the list scrolls to the selection
-const int MOST_ITEMS = 120;  // more than an operator's folder has titles
-const int ITEMS_KEPT = 60;   // when there are more than that: a few screens on both sides of the view
-// Titles that are read before the list shows: as many as an operator can make.
-constexpr std::size_t AT_ONCE = ListMessages::TITLE_LIMIT;
+const int ITEMS_IN_VIEW = 6;    // before the list scrolls to the selection
+const int MOST_ITEMS = 120;     // more than an operator's folder has titles
+const int ITEMS_KEPT = 60;      // when there are more than that: a few screens on both sides of the view
 const int EFFECTIVE_LEFT = 38;  // the scroll bar lies before it
 const int LOADER_POLL = 1;      // ms
 const int LABEL_FONT_SIZE = 13; // points
 
-// What a killed process left half-written in the title folders goes before anything is read from them.
+// Removes what a killed process left half-written in the title folders, before anything is read from them.
 void sweepTitleFolders()
 {
     const std::string root = FolderLookup::multiByte(&IPathManagerEx::getTitleResourcesPath);
@@ -57,12 +57,11 @@ void sweepTitleFolders()
 ArchiveList::ArchiveList(QLabel* folderLabel, bool autoInit, QWidget* parent)
     : KSScrollViewerWidget(parent)
     , mController(std::make_unique<ArchiveController>())
-    , mFiles(*mController)
     , mItems(this)
+    , mActions(std::make_unique<TitleMenuActions>(this, *mController))
     , mFolderLabel(folderLabel)
-    , mMenuFont(QStringLiteral("KST"))
 {
-    mMenuFont.setPixelSize(MENU_FONT_SIZE);
+    setMenuFont(QStringLiteral("KST"));
     setScrollBarAutoShow(true);
     setItemsDragFlagAlignment(DRAGFLAG_RIGHT);
     setHEffectiveArea(EFFECTIVE_LEFT, ArchiveItem::WIDGET_WIDTH);
@@ -74,6 +73,7 @@ ArchiveList::ArchiveList(QLabel* folderLabel, bool autoInit, QWidget* parent)
         mFolderLabel->setText(tr("Folder"));
     }
     initArchiveListConnect();
+    connectMenuActions();
     SaveOutage::instance(); // from here on the order may be saved
     sweepTitleFolders();
     mController->reCreateOrderXml();
@@ -104,10 +104,25 @@ void ArchiveList::initArchiveListConnect()
         if (mItems.all().size() > MOST_ITEMS && !std::exchange(mGiveBackRequested, true))
             QMetaObject::invokeMethod(this, &ArchiveList::giveBackItems, Qt::QueuedConnection);
     });
+    connect(&mRows, &TitleRows::unreadableFound, this, &ArchiveList::removeUnreadable);
     connect(this, &ArchiveList::signalAddArchiveData, this, &ArchiveList::slotAddArchiveData,
             Qt::QueuedConnection);
     connect(this, &ArchiveList::signalAddOneArchiveData, this, &ArchiveList::slotAddOneArchiveData,
             Qt::QueuedConnection);
+}
+
+void ArchiveList::connectMenuActions()
+{
+    connect(mActions.get(), &TitleMenuActions::deleteCommandSignal, this, &ArchiveList::deleteCommandSignal);
+    connect(mActions.get(), &TitleMenuActions::pasteCommandSignal, this, &ArchiveList::pasteCommandSignal);
+    connect(mActions.get(), &TitleMenuActions::addUserSignal, this, &ArchiveList::addUserSignal);
+    connect(mActions.get(), &TitleMenuActions::startTemplatePicker, this, &ArchiveList::startTemplatePicker);
+    connect(mActions.get(), &TitleMenuActions::startUserTemplatePicker, this,
+            &ArchiveList::startUserTemplatePicker);
+    connect(mActions.get(), &TitleMenuActions::archiveListMenuShow, this, &ArchiveList::archiveListMenuShow);
+    connect(mActions.get(), &TitleMenuActions::signalStartPasteArchive, this,
+            &ArchiveList::signalStartPasteArchive);
+    connect(mActions.get(), &TitleMenuActions::menuAboutToClose, this, &ArchiveList::slotMenuAboutToClose);
 }
 
 void ArchiveList::initArchiveList()
@@ -171,11 +186,6 @@ void ArchiveList::getArchiveListSuccessed(QList<Archive*> archivesList)
         selectArchive(0);
 }
 
-ArchiveItem* ArchiveList::createBaseItem(Archive* archive)
-{
-    return mItems.make(archive);
-}
-
 ArchiveItem* ArchiveList::createPasteUndoItem(Archive* archive, ArchiveItem* item)
 {
     if (!item)
@@ -188,53 +198,24 @@ void ArchiveList::initArchiveListRefreshData()
 {
     setFolderLabel();
     prepareOrder();
-    readFolder();
+    addRows(mRows.read(*this, mCurrentPath), -1);
     if (ITitlerFolderReporter* reporter = ITitlerFolderReporter::instance())
         reporter->editFolderStartStatus(mCurrentPath);
 }
 
-// Which rows are titles depends on their files. Those of a long folder are checked by and by; one title at
-// least is known.
-void ArchiveList::readFolder()
-{
-    const auto titles =
-        std::make_shared<const FolderTitles>(mCurrentPath.toStdString(), FolderTitles::WithoutOrder::ByName);
-    std::vector<std::unique_ptr<ScrollViewerRow>> rows;
-    rows.reserve(titles->count());
-    std::size_t next = 0;
-    while (rows.empty() && next < titles->count()) {
-        const std::size_t end = std::min(next + AT_ONCE, titles->count());
-        for (std::unique_ptr<Archive>& record : titles->read(next, end - next)) {
-            if (record)
-                rows.push_back(std::make_unique<ArchiveRow>(*this, titles, next, std::move(record)));
-            ++next;
-        }
-    }
-    mReadAtOnce = static_cast<int>(rows.size());
-    for (std::size_t number = next; number < titles->count(); ++number)
-        rows.push_back(std::make_unique<ArchiveRow>(*this, titles, number, nullptr));
-    addRows(std::move(rows), -1);
-    if (next == titles->count())
-        return;
-    mCheck = std::make_unique<ArchiveCheckThread>(titles, next);
-    connect(mCheck.get(), &ArchiveCheckThread::unreadableFound, this, &ArchiveList::removeUnreadable,
-            Qt::QueuedConnection);
-}
-
 void ArchiveList::finishCheck()
 {
-    if (!mCheck)
+    if (!mRows.isChecking())
         return;
-    mCheck->begin();
-    mCheck->wait();
+    mRows.waitForCheck();
     removeUnreadable();
-    mCheck.reset();
+    mRows.endCheck();
 }
 
 // A title that is shown has been read.
 void ArchiveList::removeUnreadable()
 {
-    const QSet<std::size_t> found = mCheck ? mCheck->takeUnreadable() : QSet<std::size_t>();
+    const QSet<std::size_t> found = mRows.takeUnreadable();
     QList<int> gone;
     QList<ArchiveItem*> items;
     for (int i = 0; i < count(); ++i) {
@@ -248,10 +229,9 @@ void ArchiveList::removeUnreadable()
     }
     if (gone.isEmpty())
         return;
-    for (int* position :
-         {&mOperationPosition, &mSelectedPosition, &mPressPosition, &mMoveSource, &mMoveDestination})
-        *position -=
-            static_cast<int>(std::lower_bound(gone.cbegin(), gone.cend(), *position) - gone.cbegin());
+    mActions->rowsRemoved(gone);
+    mMoveSource -=
+        static_cast<int>(std::lower_bound(gone.cbegin(), gone.cend(), mMoveSource) - gone.cbegin());
     removeRows(gone);
     for (ArchiveItem* item : std::as_const(items))
         mItems.take(item);
@@ -267,7 +247,7 @@ ArchiveItem* ArchiveList::madeItem(int index) const
     return qobject_cast<ArchiveItem*>(madeWidgetItem(index));
 }
 
-// The file may have gone since it was checked.
+// Returns the item of the row, or of the one that follows when its file has been deleted since the check.
 ArchiveItem* ArchiveList::readableItem(int index)
 {
     if (index < 0)
@@ -343,11 +323,11 @@ void ArchiveList::slotAddOneArchiveData(ArchiveItem* item)
 // The first screen comes before the titles that nobody looks at.
 void ArchiveList::beginCheck()
 {
-    if (mCheck && mItems.isComplete())
-        mCheck->begin();
+    if (mItems.isComplete())
+        mRows.beginCheck();
 }
 
-// Called after a long folder has been scrolled. What is far from view goes first.
+// Called after a long folder has been scrolled. Begins with what is farthest from view.
 void ArchiveList::giveBackItems()
 {
     mGiveBackRequested = false;
@@ -359,8 +339,8 @@ void ArchiveList::giveBackItems()
     std::sort(made.begin(), made.end());
     for (; static_cast<qsizetype>(made.size()) > ITEMS_KEPT; made.pop_back()) {
         ArchiveItem* item = made.back().second;
-        const bool isNeeded =
-            item == mSelectedItem || item == mOperationItem || item == mDraggedItem || item->isHeld();
+        const bool isNeeded = item == getSelectedArchive() || item == getCurrentOperationArchive() ||
+                              item == mDraggedItem || item->isHeld();
         ArchiveRow* row = archiveRow(getItemIndex(item));
         if (!isNeeded && giveBackWidgetItem(item))
             row->putBack(mItems.take(item));
@@ -378,16 +358,6 @@ void ArchiveList::setFolderLabel()
         mFolderLabel->setText(mCurrentPath.section(QLatin1Char('/'), -1, -1, QString::SectionSkipEmpty));
 }
 
-ArchiveItem* ArchiveList::getCurrentOperationArchive() const
-{
-    return mOperationItem;
-}
-
-ArchiveItem* ArchiveList::getSelectedArchive() const
-{
-    return mSelectedItem;
-}
-
 ArchiveItem* ArchiveList::archiveItem(int index) const
 {
     return qobject_cast<ArchiveItem*>(getWidgetItem(index));
@@ -401,13 +371,13 @@ int ArchiveList::getItemIndex(ArchiveItem* item) const
 void ArchiveList::selectArchive(int index)
 {
     ArchiveItem* item = readableItem(index);
-    if (mSelectedItem != item)
-        setDefaultItemState(mSelectedItem);
+    if (getSelectedArchive() != item)
+        setDefaultItemState(getSelectedArchive());
     if (item) {
         setSelectItemState(item);
         saveLastArchivePathAndNotifyCanvasUpdate(item);
     } else {
-        mSelectedItem.clear();
+        mSelection.forgetSelected();
         Q_EMIT signalUpdateCanvas(nullptr);
     }
 }
@@ -415,8 +385,8 @@ void ArchiveList::selectArchive(int index)
 void ArchiveList::selectOperationArchive(int index)
 {
     if (ArchiveItem* item = archiveItem(index)) {
-        if (mOperationItem != item)
-            clearOperationItemState(mOperationItem);
+        if (getCurrentOperationArchive() != item)
+            clearOperationItemState(getCurrentOperationArchive());
         setOperationItemState(item);
     }
 }
@@ -425,44 +395,25 @@ void ArchiveList::setSelectItemState(ArchiveItem* item)
 {
     if (!item)
         return;
-    mSelectedItem = item;
+    mSelection.select(item);
     LOG_USER_OPERATE(L"Thumbnail", 200,
                      L"Select  the " + std::to_wstring(getItemIndex(item)) + L" Thumbnail");
     moveCurrentArchiveItemVisble();
-    item->setStyleSheet(ArchiveItem::UN_OPERATE_AND_SELECT_STATE);
-    item->setSelected(true);
+    TitleSelection::showSelected(item);
 }
 
 void ArchiveList::setDefaultItemState(ArchiveItem* item)
 {
     if (!item)
         return;
-    item->setStyleSheet(ArchiveItem::UN_OPERATE_AND_UN_SELECT_STATE);
-    item->setSelected(false);
+    TitleSelection::showDefault(item);
     Q_EMIT itemSetDefaultState();
-}
-
-void ArchiveList::setOperationItemState(ArchiveItem* item)
-{
-    if (!item)
-        return;
-    mOperationItem = item;
-    item->setStyleSheet(item == mSelectedItem ? ArchiveItem::OPERATE_AND_SELECT_STATE
-                                              : ArchiveItem::OPERATE_AND_UN_SELECT_STATE);
-}
-
-void ArchiveList::clearOperationItemState(ArchiveItem* item)
-{
-    if (!item)
-        return;
-    item->setStyleSheet(item == mSelectedItem ? ArchiveItem::UN_OPERATE_AND_SELECT_STATE
-                                              : ArchiveItem::UN_OPERATE_AND_UN_SELECT_STATE);
 }
 
 void ArchiveList::clearOldFlagState()
 {
-    clearOperationItemState(mOperationItem);
-    mOperationItem.clear();
+    clearOperationItemState(getCurrentOperationArchive());
+    mSelection.forgetOperation();
     mLongHold = false;
 }
 
@@ -476,11 +427,11 @@ void ArchiveList::saveLastArchivePathAndNotifyCanvasUpdate(ArchiveItem* item)
 
 void ArchiveList::moveCurrentArchiveItemVisble()
 {
-    const int selected = getItemIndex(mSelectedItem);
+    const int selected = getItemIndex(getSelectedArchive());
     if (count() <= ITEMS_IN_VIEW || selected < 0)
         return;
     const int last = lastVisibleItem();
-    const bool isCut = mSelectedItem->geometry().bottom() > calculateVisibleRect().bottom();
+    const bool isCut = getSelectedArchive()->geometry().bottom() > calculateVisibleRect().bottom();
     if (selected < firstVisibleItem())
         moveToWidgetItem(selected);
     else if (selected > last || (selected == last && isCut))
@@ -490,18 +441,17 @@ void ArchiveList::moveCurrentArchiveItemVisble()
 void ArchiveList::itemReleasedEvent(KSBaseItemWidget* released, QPoint, KSScrollViewerWidget*)
 {
     auto* item = qobject_cast<ArchiveItem*>(released);
-    if (mMoveMode != 0)
+    if (mMoveMode)
         return;
+    ArchiveItem* old = getSelectedArchive();
     if (item && !mLongHold) {
-        if (item == mSelectedItem) {
-            if (item == mOperationItem)
-                setSelectItemState(item);
-        } else {
-            ArchiveItem* old = mSelectedItem;
+        if (item != old) {
             setSelectItemState(item);
             setDefaultItemState(old);
             saveLastArchivePathAndNotifyCanvasUpdate(item);
             Q_EMIT focusCommandSignal(new FocusArchiveCommand(this, item, old));
+        } else if (item == getCurrentOperationArchive()) {
+            setSelectItemState(item);
         }
     }
     mLongHold = false;
@@ -530,11 +480,6 @@ void ArchiveList::saveArchiveListOrder()
     qDeleteAll(orders);
 }
 
-void ArchiveList::startPicker()
-{
-    Q_EMIT startTemplatePicker();
-}
-
 void ArchiveList::refreshBaseItem(QString archiveFilePath, QImage leftImage)
 {
     LOG_DEBUG_OPERATE(L"ArchiveList", 200, L"refreshBaseItem " + archiveFilePath.toStdWString());
@@ -547,28 +492,19 @@ void ArchiveList::refreshBaseItem(QString archiveFilePath, QImage leftImage)
     item->updateContents(leftImage);
 }
 
-void ArchiveList::setMainScene(CanvasScene* mainScene)
-{
-    mMainScene = mainScene;
-}
-
 void ArchiveList::clearOldArchiveList()
 {
-    mCheck.reset();
+    mRows.endCheck();
     removeAll();
     mItems.clear();
 }
 
 void ArchiveList::resetPositions()
 {
-    mSelectedItem.clear();
-    mOperationItem.clear();
+    mSelection = TitleSelection();
+    mActions->setOperationPosition(-1);
     mDraggedItem.clear();
-    mOperationPosition = -1;
-    mSelectedPosition = -1;
-    mPressPosition = -1;
     mMoveSource = -1;
-    mMoveDestination = -1;
     mMoving = false;
     mLongHold = false;
 }
@@ -600,4 +536,235 @@ bool ArchiveList::orderIsDamaged() const
     std::vector<ArchiveOrder> rows;
     return FolderOrder::isKept(folder) || FolderOrder::read(folder, rows) != FolderOrder::State::Whole ||
            rows.empty();
+}
+
+// --- Opening folders ------------------------------------------------------------------------------------
+
+void ArchiveList::openFolder(const QString& path)
+{
+    endInitThread();
+    mController->setLastFolderPath(path);
+    setDefaultItemState(getSelectedArchive());
+    clearOperationItemState(getCurrentOperationArchive());
+    // Each start notice needs its end, or the old folder would stay locked for the sibling processes.
+    ITitlerFolderReporter* reporter = ITitlerFolderReporter::instance();
+    if (reporter && !mCurrentPath.isEmpty())
+        reporter->editFolderEndStatus(mCurrentPath);
+    mCurrentPath = path;
+    clearOldArchiveList();
+    resetPositions();
+    initArchiveListRefreshData();
+}
+
+void ArchiveList::refreshArchiveList(QString path)
+{
+    openFolder(path);
+    requestContents();
+    if (!isEmpty() && !IEditContext::isCreateNewNow()) {
+        selectArchive(0);
+    } else if (!checkArchiveListIsFull()) {
+        Q_EMIT signalUpdateCanvas(nullptr);
+        Q_EMIT startTemplatePicker();
+    } else {
+        selectArchive(0);
+        ListMessages::post(MessageDef::MESSAGE_LIST_FULL_ON_CREATE, ListMessages::limitText());
+    }
+}
+
+void ArchiveList::refreshArchiveListInFile(QString path, QString fileName)
+{
+    LOG_DEBUG_OPERATE(L"ArchiveList", 200, L" File:" + fileName.toStdWString());
+    openFolder(path);
+    requestContents();
+
+    const bool isFound = selectTitle(path + QLatin1Char('/') + fileName);
+    if (IEditContext::isCreateNewNow()) {
+        offerTemplateOrReportFull();
+    } else if (!isFound) {
+        if (isEmpty()) {
+            Q_EMIT signalUpdateCanvas(nullptr);
+            Q_EMIT startTemplatePicker();
+        } else {
+            selectArchive(0);
+        }
+    }
+}
+
+bool ArchiveList::selectTitle(const QString& path)
+{
+    const int index = findTitle(path);
+    if (index < 0)
+        return false;
+    archiveItem(index);
+    if (ArchiveRow* row = archiveRow(index); row && row->isUnreadable()) {
+        removeUnreadable();
+        return false;
+    }
+    selectArchive(index);
+    return true;
+}
+
+void ArchiveList::offerTemplateOrReportFull()
+{
+    if (checkArchiveListIsFull())
+        ListMessages::post(MessageDef::MESSAGE_LIST_FULL_ON_CREATE, ListMessages::limitText());
+    else
+        Q_EMIT startTemplatePicker();
+}
+
+void ArchiveList::refreshArchiveListForChangeFolderName(QString before, QString after)
+{
+    LOG_DEBUG_OPERATE(L"ArchiveList", 200,
+                      L"ArchiveList_refreshArchiveListForChangeFolderName() Enter Before:" +
+                          before.toStdWString() + L" After:" + after.toStdWString());
+    if (QDir::cleanPath(before) != QDir::cleanPath(mCurrentPath)) // a request may end with a "/"
+        return;
+    endInitThread();
+    mController->setLastFolderPath(after);
+    if (mMainScene)
+        mMainScene->folderRenamed(before, after);
+    const int selected = getItemIndex(getSelectedArchive());
+    const QString fileName = QFileInfo(titlePath(selected)).fileName();
+    setDefaultItemState(getSelectedArchive());
+    mCurrentPath = after;
+    clearOldArchiveList();
+    resetPositions();
+    initArchiveListRefreshData();
+    if (isEmpty()) {
+        Q_EMIT startTemplatePicker();
+        return;
+    }
+    // Places may differ until all titles are read, names do not.
+    if (fileName.isEmpty() || !selectTitle(after + QLatin1Char('/') + fileName))
+        selectArchive(qBound(0, selected, count() - 1));
+}
+
+// --- The option menu ------------------------------------------------------------------------------------
+
+bool ArchiveList::checkArchiveListIsFull()
+{
+    if (mRows.readAtOnce() < ListMessages::TITLE_LIMIT)
+        finishCheck();
+    return count() > ListMessages::TITLE_LIMIT - 1;
+}
+
+bool ArchiveList::checkDiskSpaceIsFull() const
+{
+    return SystemInfo::getInstance()->getDiskRemainSize(mCurrentPath.toStdWString()) <
+           LIMIT_REMAIN * KB_MILLION;
+}
+
+void ArchiveList::itemLongHoldEvent(KSBaseItemWidget* item, QPoint pos, KSScrollViewerWidget* scrollArea)
+{
+    if (mMoveMode)
+        return;
+    mLongHold = true;
+    mActions->showOptionMenu(qobject_cast<ArchiveItem*>(item), pos, scrollArea);
+    setFlickAbility(false);
+}
+
+void ArchiveList::itemRightPressedEvent(KSBaseItemWidget* item, QPoint pos, KSScrollViewerWidget* scrollArea)
+{
+    if (!mMoveMode)
+        mActions->showOptionMenu(qobject_cast<ArchiveItem*>(item), pos, scrollArea);
+}
+
+void ArchiveList::slotMenuAboutToClose()
+{
+    mActions->sendTitlerAppEvent(false);
+    clearOperationItemState(getCurrentOperationArchive());
+}
+
+void ArchiveList::wheelEvent(QWheelEvent* event)
+{
+    slotHideOptionMenu();
+    KSScrollViewerWidget::wheelEvent(event);
+}
+
+// The title on the canvas must have been written out before it can be copied. It stays selected, which is not
+// a selection of the operator's: nothing is logged and nothing scrolls.
+void ArchiveList::waitForCanvas()
+{
+    setDefaultItemState(getSelectedArchive());
+    if (mMainScene)
+        mMainScene->waitForPictures();
+    TitleSelection::showSelected(getSelectedArchive());
+}
+
+void ArchiveList::setMenuFont(const QString& family)
+{
+    QFont font(family);
+    font.setPixelSize(MENU_FONT_SIZE);
+    mActions->setMenuFont(font);
+}
+
+void ArchiveList::setSystemLanFont(QString family)
+{
+    setMenuFont(family);
+    ArchiveItem::setSystemFontFamily(family);
+    for (ArchiveItem* item : mItems.all()) // also those that may come back
+        item->updateRightChild();
+}
+
+void ArchiveList::translateText()
+{
+    mActions->translateText();
+    // A blank label is one of a folder that was closed.
+    if (mFolderLabel && mCurrentPath.isEmpty() && !mFolderLabel->text().isEmpty())
+        mFolderLabel->setText(tr("Folder"));
+}
+
+// --- Move mode: titles are dragged by their handles to another place
+// -----------------------------------------
+
+void ArchiveList::moveButtonClicked(bool isMoveMode)
+{
+    mMoveMode = isMoveMode;
+    if (isMoveMode)
+        finishCheck();
+    Q_EMIT signalItemsCanDrag(isMoveMode);
+    if (!isMoveMode)
+        clearOperationItemState(getCurrentOperationArchive());
+}
+
+void ArchiveList::itemPressedAndHoldEvent(KSBaseItemWidget* item, QPoint pos, KSScrollViewerWidget*,
+                                          bool& willMenuPopup)
+{
+    if (mMoveMode || !item)
+        return;
+    const QWidget* right = item->getRightChild();
+    willMenuPopup = right && right->geometry().contains(pos);
+}
+
+// A drag on an item scrolls.
+void ArchiveList::itemFlickEvent(KSBaseItemWidget* item, QPoint, KSScrollViewerWidget*, bool& willFlick)
+{
+    if (item)
+        willFlick = true;
+}
+
+void ArchiveList::slotDragOneItem(KSBaseItemWidget* item, int index, KSScrollViewerWidget*)
+{
+    mDraggedItem = qobject_cast<ArchiveItem*>(item);
+    clearOperationItemState(getCurrentOperationArchive());
+    setOperationItemState(mDraggedItem);
+    mMoveSource = index;
+    mMoving = true;
+}
+
+void ArchiveList::slotItemDrop()
+{
+    mMoving = false;
+    saveArchiveListOrder();
+    if (ITitlerFolderReporter* reporter = ITitlerFolderReporter::instance())
+        reporter->updateTitlerOrder(mCurrentPath);
+    ArchiveItem* item = mDraggedItem;
+    const int position = getItemIndex(item);
+    if (position < 0)
+        return;
+    mActions->setOperationPosition(position);
+    setOperationItemState(item);
+    if (mMoveSource != position)
+        Q_EMIT moveCommandSignal(new MoveArchiveCommand(this, item, mMoveSource, position, nullptr));
+    mDraggedItem.clear();
 }

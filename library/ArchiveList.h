@@ -7,29 +7,26 @@
 // only.
 #pragma once
 
-#include "canvas/BackgroundPicture.h"
 #include "document/Archive.h"
 #include "library/ArchiveItems.h"
-#include "library/TitleFileOperations.h"
+#include "library/TitleMenuActions.h"
+#include "library/TitleRows.h"
+#include "library/TitleSelection.h"
 #include "touchui/KSScrollViewerWidget.h"
 
-#include <QFont>
 #include <QImage>
 #include <QList>
 #include <QPointer>
 #include <QString>
-#include <future>
 #include <memory>
+#include <utility>
 
-class ArchiveCheckThread;
 class ArchiveController;
 class ArchiveInitThread;
 class ArchiveItem;
-class ArchiveMenu;
 class ArchiveOrder;
 class ArchiveRow;
 class CanvasScene;
-class ITitlerAPPEventFilterController;
 class QAction;
 class QLabel;
 class QUndoCommand;
@@ -49,16 +46,16 @@ public:
     ~ArchiveList() override;
 
     QString getCurrentPath() const { return mCurrentPath; }
-    ArchiveItem* getCurrentOperationArchive() const;
-    ArchiveItem* getSelectedArchive() const;
-    bool IsOptionMenuShowing() const;
+    ArchiveItem* getCurrentOperationArchive() const { return mSelection.operation(); }
+    ArchiveItem* getSelectedArchive() const { return mSelection.selected(); }
+    bool IsOptionMenuShowing() const { return mActions->isMenuShowing(); }
     int getItemIndex(ArchiveItem* item) const;
     // Null when there is no such item. Items are made when they come into view or are asked for here, and may
     // be given back when a long folder is scrolled on; who needs one longer holds it.
     ArchiveItem* archiveItem(int index) const;
     // Full path of the title file, which needs no item. Empty when there is none.
     QString titlePath(int index) const;
-    bool isMoveMode() const { return mMoveMode != 0; }
+    bool isMoveMode() const { return mMoveMode; }
     // Whether an item is being dragged.
     bool getMoveState() const { return mMoving; }
 
@@ -71,15 +68,15 @@ public:
     void selectOperationArchive(int index);
     void setSelectItemState(ArchiveItem* item);
     void setDefaultItemState(ArchiveItem* item);
-    void setOperationItemState(ArchiveItem* item);
-    void clearOperationItemState(ArchiveItem* item);
+    void setOperationItemState(ArchiveItem* item) { mSelection.mark(item); }
+    void clearOperationItemState(ArchiveItem* item) { mSelection.removeBorder(item); }
     void clearOldFlagState();
     // Remembers the title as the last one and sends it to the canvas.
     void saveLastArchivePathAndNotifyCanvasUpdate(ArchiveItem* item);
 
     // Empties the list, the path and the label.
     void cleanArchiveList();
-    void clearCopyArchive();
+    void clearCopyArchive() { mActions->clearCopyArchive(); }
     // Removes the files of titles that are no longer in the list, if the folder's order can be trusted to
     // name all others.
     void synchronizationFolderFile();
@@ -88,7 +85,7 @@ public:
     void translateText();
 
     // An item without its child widgets, which follow when it is on screen. The list is its parent.
-    ArchiveItem* createBaseItem(Archive* archive);
+    ArchiveItem* createBaseItem(Archive* archive) { return mItems.make(archive); }
     // The given item, or a new, complete one of the record.
     ArchiveItem* createPasteUndoItem(Archive* archive, ArchiveItem* item);
 
@@ -101,11 +98,17 @@ public:
     void saveArchiveListOrder();
 
     // Emits startTemplatePicker. Any thread.
-    void startPicker();
+    void startPicker() { Q_EMIT startTemplatePicker(); }
 
     // Waits for the titles of a long folder when their number matters.
     bool checkArchiveListIsFull();
     bool checkDiskSpaceIsFull() const;
+    // Whatever changes the list needs the final places of the titles: waits for a check that still runs.
+    void finishCheck();
+    // Keeps the record of an item that is to be made.
+    Archive* own(std::unique_ptr<Archive> record) { return mItems.own(std::move(record)); }
+    // Blocks until the canvas has written out the selected title.
+    void waitForCanvas();
 
 Q_SIGNALS:
     // Null: there is no title to show. The record stays the list's.
@@ -130,7 +133,7 @@ Q_SIGNALS:
     void signalStartPasteArchive();
 
 public Q_SLOTS:
-    void slotHideOptionMenu();
+    void slotHideOptionMenu() { mActions->hideMenu(); }
     void slotMenuAboutToClose();
     void slotDragOneItem(KSBaseItemWidget* item, int index, KSScrollViewerWidget* scrollArea);
     void slotItemDrop();
@@ -146,9 +149,9 @@ public Q_SLOTS:
     void itemRightPressedEvent(KSBaseItemWidget* item, QPoint pos, KSScrollViewerWidget* scrollArea);
     void itemFlickEvent(KSBaseItemWidget* item, QPoint pos, KSScrollViewerWidget* scrollArea,
                         bool& willFlick);
-    void selectOptionMenuItem(QAction* action);
+    void selectOptionMenuItem(QAction* action) { mActions->selectOptionMenuItem(action); }
     // Makes a title from the template's record, behind the operation item.
-    void createArchiveFromTemplate(Archive* temp);
+    void createArchiveFromTemplate(Archive* temp) { mActions->createArchiveFromTemplate(temp); }
     void refreshArchiveList(QString path);
     void refreshArchiveListForChangeFolderName(QString before, QString after);
     void refreshArchiveListInFile(QString path, QString fileName);
@@ -156,21 +159,20 @@ public Q_SLOTS:
     void getArchiveListSuccessed(QList<Archive*> archivesList);
     void moveCurrentArchiveItemVisble();
     // Not owned.
-    void setMainScene(CanvasScene* mainScene);
+    void setMainScene(CanvasScene* mainScene) { mMainScene = mainScene; }
     void wheelEvent(QWheelEvent* event) override;
 
 private:
     void initArchiveListConnect();
+    void connectMenuActions();
+    void setMenuFont(const QString& family);
     void initArchiveListData();
     void initArchiveListRefreshData();
     void endInitThread();
     void openFolder(const QString& path);
     void clearOldArchiveList();
-    // Whatever changes the list needs the final places of the titles: waits for a check that still runs.
-    void finishCheck();
     void beginCheck();
     void removeUnreadable();
-    void readFolder();
     void requestContents();
     void giveBackItems();
     ArchiveRow* archiveRow(int index) const;
@@ -179,59 +181,32 @@ private:
     int findTitle(const QString& path) const;
     // False when there is no such title, or its file cannot be read.
     bool selectTitle(const QString& path);
-    void decodeCopyBackground();
     void resetPositions();
     void setFolderLabel();
     void prepareOrder();
     bool orderIsDamaged() const;
     void offerTemplateOrReportFull();
-    void showOptionMenu(KSBaseItemWidget* item, QPoint pos, KSScrollViewerWidget* scrollArea);
-    void createOptionMenu();
-    // Sibling processes know that a popup is open, and a press in one of them closes it.
-    void sendTitlerAppEvent(bool open);
-    void exeCreateArchive();
-    void exeCopyArchive();
-    void exePasteArchive();
-    void exeDeleteArchive();
-    void exeAddUserArchive();
-    // Blocks until the canvas has written the title out.
-    void waitForCanvas();
-    void emitPasteCommand(std::unique_ptr<Archive> archive);
     ArchiveItem* findItem(const QString& path) const;
 
     std::unique_ptr<ArchiveController> mController;
-    TitleFileOperations mFiles;
     std::unique_ptr<ArchiveInitThread> mInitThread;
-    bool mIgnoreLoaded = false;                 // a loader that is being ended may still deliver
-    std::unique_ptr<ArchiveCheckThread> mCheck; // while places of titles are not final
-    int mReadAtOnce = 0;                        // titles known to be readable when the folder was opened
-    std::unique_ptr<ArchiveMenu> mMenu;
+    bool mIgnoreLoaded = false; // a loader that is being ended may still deliver
+    TitleRows mRows;
     ArchiveItems mItems;
     bool mContentsRequested = false;
     bool mGiveBackRequested = false;
-    std::unique_ptr<Archive> mCopyArchive;
-    TitlePictures mCopyPictures;
-    // The background of the copy, so that the canvas need not decode it when it is pasted.
-    std::future<BackgroundPicture::Decoded> mCopyDecoder;
-    std::shared_ptr<const BackgroundPicture> mCopyBackground;
+    std::unique_ptr<TitleMenuActions> mActions;
     QLabel* mFolderLabel;
     CanvasScene* mMainScene = nullptr;
-    QPointer<ITitlerAPPEventFilterController> mEventController;
     // A folder whose order could not be read when it was opened, or not be written since, is not cleaned up
     // before it is opened again.
     enum class CleanUp { Allowed, Withheld };
     CleanUp mCleanUp = CleanUp::Withheld;
     QString mCurrentPath;
-    QFont mMenuFont;
-    QPointer<ArchiveItem> mSelectedItem;
-    QPointer<ArchiveItem> mOperationItem;
+    TitleSelection mSelection;
     QPointer<ArchiveItem> mDraggedItem;
-    int mOperationPosition = -1;
-    int mSelectedPosition = -1;
-    int mPressPosition = -1;
-    int mMoveSource = -1;
-    int mMoveDestination = -1;
-    int mMoveMode = 0; // 1 while titles can be dragged
+    int mMoveSource = -1;   // row of the item that is being dragged
+    bool mMoveMode = false; // titles can be dragged
     bool mMoving = false;
     bool mLongHold = false; // the release of the finger that opened the menu selects nothing
 };

@@ -1,21 +1,21 @@
-// Building, painting and language of the dialog; see FolderPickerActions.cpp for the buttons and the editing
-// of names, and FolderPickerChanges.cpp for what comes from elsewhere.
 #include "library/FolderPicker.h"
 
 #include "canvas/MessageBoxController.h"
-#include "document/Archive.h"
-#include "document/ArchiveController.h"
+#include "library/DialogButtonImages.h"
 #include "library/FolderEditor.h"
 #include "library/FolderNameRules.h"
 #include "library/FolderPickerFactory.h"
-#include "library/TemplateThumbnail.h"
-#include "library/TitleFileOperations.h"
-#include "library/TitlerUtility.h"
+#include "library/IEditContext.h"
+#include "library/ListMessages.h"
+#include "library/TitlePreview.h"
 #include "support/ConfinedPath.h"
-#include "touchui/CustomTreeDelegete.h"
+#include "support/LogManager.h"
+#include "support/RefusedWrites.h"
+#include "touchui/KSInputContext.h"
 #include "touchui/KSPushbutton.h"
 #include "touchui/KSTreeModel.h"
 #include "touchui/KSTreeView.h"
+#include "touchui/KSVIEW.h"
 #include "touchui/OneFinger.h"
 #include "touchui/WindowPlaceKeeper.h"
 
@@ -46,26 +46,55 @@ const int BUTTON_SPACE = 8;
 const int SIDE_MARGIN = FRAME_MARGIN + BUTTON_SPACE; // beside what lies in the frame
 constexpr QSize BUTTON_SIZE(160, 48);
 // Inside the frame, which is dark by itself.
-constexpr QRect MASK_AREA(7, 9, 1088 - 14, 742 - 18);
+constexpr QMargins FRAME(7, 9, 7, 9);
 constexpr QColor FRAME_COLOR(17, 17, 17);
 constexpr QColor FRAME_LINE_COLOR(85, 85, 85);
 
-const char BUTTON_IMAGES[] =
-    "TextToolPanel_Buttons:Button_48_Rest_Left:Button_48_Rest_Center:Button_48_Rest_Right:"
-    "Button_48_Pressed_Left:Button_48_Pressed_Center:Button_48_Pressed_Right:"
-    "Button_48_Disabled_Left:Button_48_Disabled_Center:Button_48_Disabled_Right:"
-    "Button_48selected_Rest_Left:Button_48selected_Rest_Center:Button_48selected_Rest_Right:"
-    "Button_48selected_Pressed_Left:Button_48selected_Pressed_Center:Button_48selected_Pressed_Right:"
-    "Button_48selected_Disabled_Left:Button_48selected_Disabled_Center:Button_48selected_Disabled_Right";
+void logTap(const wchar_t* text)
+{
+    LOG_USER_OPERATE(L"Folder Area", 200, text);
+}
+
+QString plainName(const std::wstring& nameOrPath)
+{
+    return QString::fromStdWString(nameOrPath).section(QLatin1Char('/'), -1, -1, QString::SectionSkipEmpty);
+}
+
+// Whether the current row is a title in that folder, which is closed.
+bool isCurrentHiddenBy(const KSTreeView& tree, const QModelIndex& folder)
+{
+    return tree.currentIndex().parent() == folder && !tree.isExpanded(folder);
+}
+
+bool checkCanShowTemplate(const FolderRows& rows, const QModelIndex& index)
+{
+    const QModelIndex folder = rows.folderOf(index);
+    if ((!rows.hasTitles(folder) || IEditContext::isCreateNewNow()) &&
+        rows.disk().isDiskFull(rows.folderPath(rows.nameOf(folder)), false)) {
+        ListMessages::post(MessageDef::MESSAGE_DISK_FULL_ON_CREATE, FolderPicker::tr("File"));
+        return false;
+    }
+    return true;
+}
+
+bool checkCanCreateNew(const FolderRows& rows, const QModelIndex& index)
+{
+    if (IEditContext::isCreateNewNow() &&
+        rows.titleCount(rows.folderOf(index)) == ListMessages::TITLE_LIMIT) {
+        ListMessages::post(MessageDef::MESSAGE_FOLDER_EXISTS);
+        return false;
+    }
+    return true;
+}
 
 } // namespace
 
 FolderPicker::FolderPicker(QWidget* parent)
     : QDialog(parent, Qt::Dialog | Qt::FramelessWindowHint)
-    , mFactory(new FolderPickerFactory(this))
-    , mModel(new KSTreeModel(mFactory, FolderPickerFactory::ColumnCount, this))
-    , mMasks(this, MASK_AREA)
+    , mRows(this)
+    , mMasks(this, FRAME)
     , mBackground(QStringLiteral(":/ToolBarbg_bluegrid"))
+    , mSeparator(QStringLiteral(":/Separator_H"))
 {
     setObjectName(QStringLiteral("FolderPickerWindow"));
     setStyleSheet(QStringLiteral("QDialog#FolderPickerWindow {font-size:24px; background:rgb(50, 50, 50);}"));
@@ -73,6 +102,7 @@ FolderPicker::FolderPicker(QWidget* parent)
     setFixedSize(FOLDER_PICKER_SIZE);
     new WindowPlaceKeeper(this); // child of this
     createTree();
+    mEdit = std::make_unique<FolderNameEdit>(&mRows, mTree, nullptr);
     createDetails();
     createButtons();
     connectTree();
@@ -86,9 +116,9 @@ FolderPicker::FolderPicker(QWidget* parent)
 
 FolderPicker::~FolderPicker()
 {
-    // What the editor and the tree send while they go would reach a dialog that is half gone.
-    const QPointer<FolderEditor> editor = mEditor;
-    cancelEdit();
+    // What the editor and the tree send while they are destroyed would reach a dialog that is half destroyed.
+    const QPointer<FolderEditor> editor = mEdit->editor();
+    mEdit->cancelEdit();
     delete editor;
     mTree->disconnect(this);
     delete mTree;
@@ -104,7 +134,7 @@ void FolderPicker::createTree()
     mTree = new KSTreeView(this);
     mTree->setObjectName(QStringLiteral("folderTree"));
     mTree->setGeometry(QRect(place, FOLDER_TREEVIEW_SIZE));
-    mTree->setModel(mModel);
+    mTree->setModel(mRows.model());
     mTree->setCheckBoxVisible(false);
     mTree->setSortingEnabled(true);
     mTree->setHorizontalScrollBarPolicy(Qt::ScrollBarAlwaysOff);
@@ -117,23 +147,13 @@ void FolderPicker::createTree()
 
 void FolderPicker::createDetails()
 {
-    const auto label = [this](const QRect& area, const char* name) {
-        auto* made = new QLabel(this);
-        made->setObjectName(QLatin1String(name));
-        made->setTextFormat(Qt::PlainText);
-        made->setStyleSheet(COLOR_TRANSPARENT + QStringLiteral("color:rgb(220, 220, 220);"));
-        made->setGeometry(area);
-        return made;
-    };
-    mTitle = label(QRect(2 * FRAME_MARGIN, FRAME_MARGIN, HSEPARATOR_LENGTH - 2 * FRAME_MARGIN,
-                         STARTPOINT_OF_TOP_HSEPARATOR.y() - FRAME_MARGIN),
-                   "folderPickerTitle");
+    mTitle =
+        TitlePreview::createLabel(this,
+                                  QRect(2 * FRAME_MARGIN, FRAME_MARGIN, HSEPARATOR_LENGTH - 2 * FRAME_MARGIN,
+                                        STARTPOINT_OF_TOP_HSEPARATOR.y() - FRAME_MARGIN),
+                                  "folderPickerTitle");
     const int left = FRAME_MARGIN + (mTree->x() - FRAME_MARGIN - LEFT_WIDTH) / 2;
-    mThumbnail = label(QRect(left, mTree->y(), LEFT_WIDTH, WIDGET_HEIGHT), "folderThumbnail");
-    mSizeLabel =
-        label(QRect(left, mTree->y() + WIDGET_HEIGHT + FRAME_MARGIN, LEFT_WIDTH, 34), "folderFileSize");
-    mSizeLabel->setAlignment(Qt::AlignHCenter | Qt::AlignVCenter);
-    clearThumbnailArea();
+    mPreview = std::make_unique<TitlePreview>(this, QPoint(left, mTree->y()));
 }
 
 void FolderPicker::createButtons()
@@ -147,15 +167,18 @@ void FolderPicker::createButtons()
     const int top = STARTPOINT_OF_BOTTOM_HSEPARATOR.y() + SEPARATOR_HEIGHT;
     const int y = top + (FOLDER_PICKER_SIZE.height() - FRAME_MARGIN - top - BUTTON_SIZE.height()) / 2;
     for (int id = 0; id < ButtonCount; ++id) {
-        auto* button = new KSPushbutton(QString::fromLatin1(BUTTON_IMAGES), this);
+        auto* button = new KSPushbutton(QString::fromLatin1(DIALOG_BUTTON_IMAGES), this);
         button->setObjectName(QLatin1String(names[id]));
         button->setStyleSheet(QStringLiteral("font-size:24px; color:rgb(220, 220, 220);"));
         button->setGeometry(QRect(QPoint(places[id], y), BUTTON_SIZE));
         button->setAutoDefault(false);
         button->setButtonId(id);
-        connect(button, qOverload<int>(&KSPushbutton::pressed), this, &FolderPicker::slotButtonPressed);
-        connect(button, qOverload<bool, int>(&KSPushbutton::signalReleased), this,
-                &FolderPicker::slotButtonReleased);
+        connect(button, &QAbstractButton::pressed, this,
+                [button] { button->changeButtonState(KSPushbutton::ButtonPressed); });
+        connect(button, qOverload<bool, int>(&KSPushbutton::signalReleased), this, [button] {
+            button->changeButtonState(button->isEnabled() ? KSPushbutton::ButtonRest
+                                                          : KSPushbutton::ButtonDisabled);
+        });
         mButtons[id] = button;
     }
     connect(mButtons[DuplicateButton], &QAbstractButton::clicked, this, &FolderPicker::duplicateFolder);
@@ -172,29 +195,16 @@ void FolderPicker::connectTree()
     connect(mTree, &KSTreeView::signalCurrentChangedByTouch, this, &FolderPicker::slotCurrentChangedByTouch);
     connect(mTree, &KSTreeView::signalPressedAndHold, this, &FolderPicker::startEditing);
     connect(mTree->header(), &QHeaderView::sectionClicked, this, &FolderPicker::slotHeaderClicked);
-    connect(mTree->treeDelegate(), &CustomTreeDelegete::signalLineEditCommitted, this, &FolderPicker::doEdit);
-    connect(mFactory, &FolderPickerFactory::signalCreateEditor, this, &FolderPicker::slotCreateEditor);
+    connect(mEdit.get(), &FolderNameEdit::folderMoved, this, &FolderPicker::folderMoved);
+    connect(mEdit.get(), &FolderNameEdit::rowAdded, this, [this] { mPreview->clearThumbnailArea(); });
+    connect(mEdit.get(), &FolderNameEdit::unmadeRowDropped, this, [this](bool isFolderCurrent) {
+        mPreview->clearThumbnailArea();
+        if (isVisible())
+            ChangeButtonState(isFolderCurrent ? ALL_BUTTONS : NEW_FOLDER_AND_CANCEL);
+    });
     for (QObject* object : std::initializer_list<QObject*>{mTree, mTree->viewport(), mTree->header(),
                                                            mTree->header()->viewport()})
         object->installEventFilter(this);
-}
-
-FolderEditor* FolderPicker::editor() const
-{
-    return mEditor;
-}
-
-void FolderPicker::slotButtonPressed(int id)
-{
-    if (id >= 0 && id < ButtonCount)
-        mButtons[id]->changeButtonState(KSPushbutton::ButtonPressed);
-}
-
-void FolderPicker::slotButtonReleased(bool, int id)
-{
-    if (id >= 0 && id < ButtonCount)
-        mButtons[id]->changeButtonState(mButtons[id]->isEnabled() ? KSPushbutton::ButtonRest
-                                                                  : KSPushbutton::ButtonDisabled);
 }
 
 void FolderPicker::ChangeButtonState(folderButtonState state)
@@ -227,13 +237,12 @@ void FolderPicker::setSystemLanFont(QFont font)
     font.setPixelSize(TITLE_FONT_SIZE);
     mTitle->setFont(font);
     font.setPixelSize(FONT_SIZE);
-    mItemFont = font;
-    mSizeLabel->setFont(font);
+    mPreview->setFont(font);
     for (KSPushbutton* button : mButtons)
         button->setFont(font);
     mTree->header()->setFont(font);
-    mFactory->setItemFont(font);
-    mModel->setAttributeOfAll(Qt::FontRole, font);
+    mRows.factory()->setItemFont(font);
+    mRows.model()->setAttributeOfAll(Qt::FontRole, font);
 }
 
 void FolderPicker::translateText()
@@ -244,55 +253,221 @@ void FolderPicker::translateText()
     mButtons[CreateButton]->setText(tr("New Folder"));
     mButtons[OpenButton]->setText(tr("Open"));
     mButtons[CancelButton]->setText(tr("Cancel"));
-    mModel->setHeaderData(FolderPickerFactory::NameColumn, Qt::Horizontal, tr("Name"));
-    mModel->setHeaderData(FolderPickerFactory::DateColumn, Qt::Horizontal, tr("Date"));
+    mRows.model()->setHeaderData(FolderPickerFactory::NameColumn, Qt::Horizontal, tr("Name"));
+    mRows.model()->setHeaderData(FolderPickerFactory::DateColumn, Qt::Horizontal, tr("Date"));
 }
 
 void FolderPicker::showOpacityWidget(bool show)
 {
-    if (mOpacity == nullptr) {
-        mOpacity = new QWidget(this);
-        mOpacity->setFocusPolicy(Qt::NoFocus);
-        QPalette dark;
-        dark.setColor(QPalette::Window, QColor(0, 0, 0, 166));
-        mOpacity->setPalette(dark);
-        mOpacity->setAutoFillBackground(true);
-        mOpacity->setGeometry(rect());
-    }
+    if (mOpacity == nullptr)
+        mOpacity = DialogMasks::createMask(this, rect());
     mOpacity->raise();
     mOpacity->setVisible(show);
 }
 
-// --- The pressed title ----------------------------------------------------------------------------------
-
-void FolderPicker::initThumbnailArea(const QString& path)
+void FolderPicker::updateTreeView()
 {
-    const QImage picture = TemplateThumbnail::read(path);
-    mThumbnail->setPixmap(QPixmap::fromImage(TemplateThumbnail::onChecker(picture)));
-    mThumbnail->show();
-    mSizeLabel->setText(DISPLAY_FILE_SIZE);
+    mEdit->cancelEdit();
+    mRows.reload();
+    mTree->scrollToTop();
+    mPreview->clearThumbnailArea();
+    mButtons[DuplicateButton]->setEnabled(false);
+    mButtons[OpenButton]->setEnabled(false);
 }
 
-void FolderPicker::updateThumbnailArea(const QString& path)
+// --- The tree -------------------------------------------------------------------------------------------
+
+void FolderPicker::pressedFolder(QModelIndex indexPress)
 {
-    // A title with a background of its own has a small picture of that one's kind.
-    Archive archive;
-    if (ArchiveController().getOneArchive(path, &archive) && !archive.getThumbnailSmall().empty()) {
-        initThumbnailArea(archive.getFullPathOfThumbnailSmall());
+    if (!indexPress.isValid())
+        return;
+    // Opening and closing a folder picks it, so that the buttons act on what was touched last. A title of it
+    // that was chosen stays so for as long as it can be seen.
+    const QPersistentModelIndex pressed = indexPress.siblingAtColumn(FolderPickerFactory::NameColumn);
+    if (mRows.folderOf(mTree->currentIndex()) != mRows.folderOf(pressed) ||
+        isCurrentHiddenBy(*mTree, pressed))
+        mTree->setCurrentIndex(pressed);
+    const QModelIndex current = mTree->currentIndex();
+    if (mRows.checkItemisFolder(current)) {
+        ChangeButtonState(ALL_BUTTONS);
+        mPreview->clearThumbnailArea();
         return;
     }
-    const std::string title = path.toStdString();
-    const std::string name = TitlerUtility::getThumbnailNameFromTitlePath(
-        title, TitleFileOperations::THUMBNAIL_SMALL.toStdString());
-    initThumbnailArea(QString::fromStdString(ConfinedPath::namedByTitle(
-        QFileInfo(path).path().toStdString(), TitlerUtility::getThumbnailPathFromTitlePath(title, name))));
+    ChangeButtonState(NO_DUPLICATE);
+    mPreview->updateThumbnailArea(mRows.titleFile(current).filePath());
 }
 
-void FolderPicker::clearThumbnailArea()
+void FolderPicker::slotCurrentChangedByTouch(QModelIndex)
 {
-    mThumbnail->hide();
-    mThumbnail->setPixmap(QPixmap());
-    mSizeLabel->clear();
+    logTap(L"Select Folder or File");
+}
+
+void FolderPicker::slotHeaderClicked(int column)
+{
+    const QString name = mRows.model()->headerData(column, Qt::Horizontal).toString();
+    const bool ascending = mTree->header()->sortIndicatorOrder() == Qt::AscendingOrder;
+    LOG_USER_OPERATE(L"File List", 200,
+                     L"Sort by Column: " + name.toStdWString() +
+                         (ascending ? L" in AscendingOrder order" : L" in DescendingOrder order"));
+}
+
+void FolderPicker::startEditing(QModelIndex index)
+{
+    if (mEdit->isActive() || !index.isValid() || index.column() != FolderPickerFactory::NameColumn ||
+        !mRows.checkItemisFolder(index) || !index.data(KSVIEW::ItemEditableRole).toBool() ||
+        isVanished(index))
+        return;
+    mEdit->startRename(index);
+}
+
+// Returns whether the folder has been deleted by others without notice; its row is removed then.
+bool FolderPicker::isVanished(const QModelIndex& index)
+{
+    const QString name = mRows.nameOf(mRows.folderOf(index));
+    if (!index.isValid() || mRows.disk().isTitleFolder(mRows.regetRootPath(), name))
+        return false;
+    slotDeleteFolder(name.toStdWString());
+    return true;
+}
+
+void FolderPicker::showSoftKeyboard()
+{
+    if (mEdit->isActive())
+        mEdit->callSoftKeyBoard();
+}
+
+// --- The buttons ----------------------------------------------------------------------------------------
+
+// Ends the edit of a name before something else is done. Returns true when it has to go on.
+bool FolderPicker::isEditKept()
+{
+    return mEdit->isActive() && mEdit->renameAction();
+}
+
+void FolderPicker::createFolder()
+{
+    logTap(L"Tap New Folder Button");
+    if (isEditKept())
+        return;
+    if (mRows.disk().isDiskFull(mRows.regetRootPath(), false)) {
+        ListMessages::post(MessageDef::MESSAGE_DISK_FULL_ON_CREATE, tr("folder"));
+        return;
+    }
+    if (mEdit->startCreate(mUntitled))
+        ChangeButtonState(ALL_BUTTONS);
+}
+
+void FolderPicker::duplicateFolder()
+{
+    logTap(L"Tap Duplicate Button");
+    if (isEditKept())
+        return;
+    const QModelIndex source = mRows.folderOf(mTree->currentIndex());
+    if (!source.isValid() || isVanished(source))
+        return;
+    const QString name = mRows.nameOf(source);
+    mRows.regetRootPath();
+    if (mRows.disk().isDiskFull(mRows.folderPath(name), true)) {
+        ListMessages::post(MessageDef::MESSAGE_DISK_FULL_ON_DUPLICATE, tr("folder"));
+        return;
+    }
+    mEdit->startDuplicate(name, source);
+}
+
+void FolderPicker::openFolder()
+{
+    logTap(L"Tap Open Button");
+    if (isEditKept())
+        return;
+    const QModelIndex current = mTree->currentIndex().siblingAtColumn(FolderPickerFactory::NameColumn);
+    if (!current.isValid() || isVanished(current) || !checkCanShowTemplate(mRows, current) ||
+        !checkCanCreateNew(mRows, current))
+        return;
+    const QString name = mRows.nameOf(mRows.folderOf(current));
+    mKeepDialog = false;
+    if (mRows.checkItemisFolder(current))
+        Q_EMIT changeFolderPath(mRows.folderPath(name));
+    else
+        Q_EMIT changeFolderFile(mRows.folderPath(name), mRows.titleFile(current).fileName());
+    setCurrentFolderName(name);
+    if (mKeepDialog) {
+        mKeepDialog = false;
+        return;
+    }
+    if (KSInputContext* context = KSInputContext::instance(); context && parentWidget())
+        context->setWindowID(parentWidget()->winId());
+    done(Accepted);
+    Q_EMIT clearUndoCommandStack();
+}
+
+void FolderPicker::cancelFolder()
+{
+    logTap(L"Tap Cancel Button");
+    mEdit->cancelEdit();
+    done(Rejected);
+    Q_EMIT signalCancelClicked();
+}
+
+// --- What other processes do to folders -----------------------------------------------------------------
+
+void FolderPicker::folderNameChanged(FileManagerDefine::tagChangeFolderNameParam param)
+{
+    const QString before = plainName(param.oldPath);
+    const QString after = plainName(param.newPath);
+    if (!FolderNameRules::isFolderName(before) || !FolderNameRules::isFolderName(after))
+        return;
+    const QString oldPath = mRows.regetRootPath() + QLatin1Char('/') + before;
+    const QString newPath = mRows.folderPath(after);
+    if (!mRows.disk().staysBelow(mRows.regetRootPath(), after)) {
+        ConfinedPath::logRefusal(L"a folder is said to be called like a link: ", newPath.toStdString());
+        return;
+    }
+    Q_EMIT folderMoved(oldPath, newPath);
+    if (mRows.isNameOf(before, currentFolderName())) {
+        mRows.openFolderRenamed(after);
+        Q_EMIT folderNameChange(oldPath, newPath);
+        // The steps back speak of the old path, also that of a text that was just being typed.
+        Q_EMIT clearUndoCommandStack();
+    }
+    if (isVisible())
+        renameRow(before, after);
+}
+
+void FolderPicker::renameRow(const QString& before, const QString& after)
+{
+    mEdit->sourceRenamed(before, after);
+    mRows.factory()->renameFolder(before, after);
+    if (mEdit->isRenaming(before)) {
+        continuefolderNameChanged(after); // the edit goes on from the new name
+        return;
+    }
+    const QModelIndex index = mRows.getFolderIndex(before, mEdit->row());
+    if (index.isValid()) {
+        mRows.setAttributeAtDoEdit(index, after);
+        mRows.insertChildrenIndex(index, after);
+    }
+    mRows.factory()->importSourceData();
+    mTree->viewport()->update();
+}
+
+void FolderPicker::slotDeleteFolder(std::wstring name)
+{
+    const QString folder = plainName(name);
+    const QString path = mRows.folderPath(folder);
+    if (FolderNameRules::isFolderName(folder) && !QFileInfo::exists(path))
+        RefusedWrites::forgetFolder(path.toStdString()); // what could not be saved is not wanted
+    if (mRows.isNameOf(folder, currentFolderName()))
+        setCurrentFolderName(QString());
+    const QModelIndex index = mRows.getFolderIndex(folder, mEdit->unmadeRow());
+    if (!index.isValid())
+        return;
+    const QModelIndex current = mRows.folderOf(mTree->currentIndex());
+    if (isVisible() && current.isValid() && current == index) {
+        ChangeButtonState(NEW_FOLDER_AND_CANCEL);
+        mTree->setCurrentIndex(QModelIndex());
+        mPreview->clearThumbnailArea();
+    }
+    mRows.remove(index);
 }
 
 // --- Events ---------------------------------------------------------------------------------------------
@@ -302,16 +477,16 @@ void FolderPicker::paintEvent(QPaintEvent* event)
     QDialog::paintEvent(event);
     QPainter painter(this);
     painter.fillRect(rect(), FRAME_COLOR);
-    painter.fillRect(MASK_AREA, QColor(50, 50, 50));
-    painter.setClipRect(MASK_AREA);
+    const QRect inside = rect().marginsRemoved(FRAME);
+    painter.fillRect(inside, QColor(50, 50, 50));
+    painter.setClipRect(inside);
     painter.drawPixmap(0, 0, mBackground);
     painter.setClipping(false);
     painter.setPen(FRAME_LINE_COLOR);
-    painter.drawRect(MASK_AREA.adjusted(0, 0, -1, -1));
+    painter.drawRect(inside.adjusted(0, 0, -1, -1));
     painter.drawRect(rect().adjusted(0, 0, -1, -1));
-    const QImage line(QStringLiteral(":/Separator_H"));
     for (const QPoint& start : {STARTPOINT_OF_TOP_HSEPARATOR, STARTPOINT_OF_BOTTOM_HSEPARATOR})
-        painter.drawImage(QRect(start, QSize(HSEPARATOR_LENGTH, SEPARATOR_HEIGHT)), line);
+        painter.drawImage(QRect(start, QSize(HSEPARATOR_LENGTH, SEPARATOR_HEIGHT)), mSeparator);
 }
 
 void FolderPicker::showEvent(QShowEvent* event)
@@ -325,8 +500,8 @@ void FolderPicker::showEvent(QShowEvent* event)
 void FolderPicker::hideEvent(QHideEvent* event)
 {
     if (!event->spontaneous()) {
-        cancelEdit();
-        mMessageUp = false;
+        mEdit->cancelEdit();
+        mEdit->forgetMessage();
     }
     QDialog::hideEvent(event);
 }
@@ -364,11 +539,11 @@ bool FolderPicker::filterWhileEditing(QEvent* event)
     case QEvent::MouseButtonRelease:
     case QEvent::TouchUpdate:
     case QEvent::TouchEnd:
-        return mMessageUp;
+        return mEdit->isMessageUp();
     case QEvent::MouseButtonPress:
     case QEvent::MouseButtonDblClick:
     case QEvent::TouchBegin:
-        return mEditing && renameAction();
+        return isEditKept();
     default:
         return false;
     }

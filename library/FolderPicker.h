@@ -4,34 +4,36 @@
 // as the main window and is shown by exec(). GUI thread.
 #pragma once
 
-#include "library/DialogMasks.h"
+#include "library/FolderNameEdit.h"
 #include "library/FolderPickerController.h"
+#include "library/FolderRows.h"
 #include "messaging/services/FileManagerDefine.h"
 #include "messaging/services/MessageDefine.h"
+#include "touchui/DialogMasks.h"
 
 #include <QDialog>
 #include <QFont>
-#include <QPersistentModelIndex>
+#include <QImage>
 #include <QPixmap>
 #include <QPoint>
-#include <QPointer>
 #include <QSize>
 #include <QString>
+#include <memory>
 #include <string>
 
 class FolderEditor;
-class FolderPickerFactory;
 class KSPushbutton;
 class KSTreeModel;
 class KSTreeView;
 class QLabel;
+class TitlePreview;
 
 class FolderPicker : public QDialog
 {
     Q_OBJECT
 
 public:
-    static const int LEFT_WIDTH = 240;
+    static const int LEFT_WIDTH = 240; // of the picture of a title, whose height is next
     static const int WIDGET_HEIGHT = 135;
     static const int HSEPARATOR_LENGTH = 1069;
     static const int LIMIT_REMAIN = FolderPickerController::LIMIT_REMAIN;
@@ -54,14 +56,15 @@ public:
     };
     using folderButtonState = _folderButtonState;
 
-    enum FolderEdit { FOLDER_EDIT_NONE = 0, FOLDER_EDIT_RENAME, FOLDER_EDIT_CREATE, FOLDER_EDIT_DUPLICATE };
+    using FolderEdit = FolderNameEdit::FolderEdit;
+    using enum FolderNameEdit::FolderEdit;
 
     explicit FolderPicker(QWidget* parent = nullptr);
     ~FolderPicker() override;
 
     // Marks the folder that is open in the editor, which cannot take a new name meanwhile. Empty: none is.
-    void setCurrentFolderName(const QString& name);
-    QString currentFolderName() const { return mCurrentFolderName; }
+    void setCurrentFolderName(const QString& name) { mRows.setOpenFolder(name); }
+    QString currentFolderName() const { return mRows.openFolder(); }
     void setSystemLanFont(QFont font);
     void translateText();
     // Reads all folders anew; what was selected and being edited is dropped.
@@ -82,10 +85,10 @@ public:
     void showMessageMaskWidget(bool show) { mMasks.showMessageMaskWidget(show); }
 
     KSTreeView* treeView() const { return mTree; }
-    KSTreeModel* treeModel() const { return mModel; }
+    KSTreeModel* treeModel() const { return mRows.model(); }
     // Null while no name is being edited.
-    FolderEditor* editor() const;
-    FolderEdit editAction() const { return mAction; }
+    FolderEditor* editor() const { return mEdit->editor(); }
+    FolderEdit editAction() const { return mEdit->action(); }
 
 Q_SIGNALS:
     // Full paths of folders; the name of a title file.
@@ -104,7 +107,7 @@ public Q_SLOTS:
     void openFolder();
     void cancelFolder();
     void ChangeButtonState(folderButtonState state);
-    void slotCloseSoftwareKeyBoardForFileManager();
+    void slotCloseSoftwareKeyBoardForFileManager() { FolderNameEdit::closeSoftKeyBoard(); }
 
     // The tree.
     void pressedFolder(QModelIndex indexPress);
@@ -114,24 +117,21 @@ public Q_SLOTS:
     void slotHeaderClicked(int column);
 
     // The editor.
-    void slotCreateEditor(FolderEditor* editor);
-    void slotPressedClose();
-    void slotPressedEnter();
-    void slotEditStateEnd();
-    void slotInvalidInput();
-    void slotLongInput();
-    void slotValidInput();
-    void slotTextChanged(QString text);
+    void slotCreateEditor(FolderEditor* editor) { mEdit->slotCreateEditor(editor); }
+    void slotPressedClose() { mEdit->slotPressedClose(); }
+    void slotPressedEnter() { mEdit->slotPressedEnter(); }
+    void slotEditStateEnd() { mEdit->slotEditStateEnd(); }
+    void slotInvalidInput() { mEdit->slotInvalidInput(); }
+    void slotLongInput() { mEdit->slotLongInput(); }
+    void slotValidInput() { mEdit->slotValidInput(); }
+    void slotTextChanged(QString) {} // the field keeps what is typed
     // A message box was closed.
-    void reCallcallSoftKeyBoard(MessageDefine::tagCloseParam param);
+    void reCallcallSoftKeyBoard(MessageDefine::tagCloseParam param) { mEdit->messageClosed(param); }
 
     // What the file manager has done to folders. Names, or full paths whose last part is taken.
     void folderNameChanged(FileManagerDefine::tagChangeFolderNameParam param);
-    void continuefolderNameChanged(QString after);
+    void continuefolderNameChanged(QString after) { mEdit->goOnFrom(after); }
     void slotDeleteFolder(std::wstring name);
-
-    void slotButtonPressed(int id);
-    void slotButtonReleased(bool outside, int id);
 
     // Escape and the window manager: Cancel, where that can be pressed.
     void reject() override;
@@ -149,73 +149,22 @@ private:
     void createDetails();
     void createButtons();
     void connectTree();
-    QString regetRootPath();
-    QString folderPath(const QString& name) const;
 
-    bool checkItemisFolder(const QModelIndex& index) const;
-    QModelIndex folderOf(const QModelIndex& index) const;
-    // The current row is a title in that folder, which is closed.
-    bool isHiddenBy(const QModelIndex& folder) const;
-    QString nameOf(const QModelIndex& index) const;
-    QModelIndex getFolderIndex(const QString& name, const QModelIndex& skipped = QModelIndex()) const;
-    // A name that comes from another process stands for the folder.
-    bool isNameOf(const QString& name, const QString& folder) const;
-    bool checkFolderNameIsExist(const QString& name) const;
-    bool checkDiskSpaceIsFull(const QString& path, bool withFolderSize) const;
-    bool checkCanShowTemplate(const QModelIndex& index) const;
-    bool checkCanCreateNew(const QModelIndex& index) const;
     bool isVanished(const QModelIndex& index);
-
-    void setDefauleItemAttribute(const QModelIndex& index, const QString& name);
-    void setAttributeAtDoEdit(const QModelIndex& index, const QString& name);
-    void insertChildrenIndex(const QModelIndex& index, const QString& name);
-    void setEditable(const QString& name, bool editable);
-    void removeRow(const QModelIndex& index);
-    void dropUnmadeFolder(const QPersistentModelIndex& row, const QString& source);
-
-    bool addFolderRow(const QString& name, FolderEdit action, const QModelIndex& behind);
-    bool openEditor(const QModelIndex& index, FolderEdit action);
-    void callSoftKeyBoard();
-    void showLimit(const QString& text, int code);
-    // Ends an edit; true when that cannot be, for the name is in use.
-    bool renameAction();
-    void cancelEdit();
-    void doEdit(const QString& name, const QModelIndex& index);
-    void doRename(const QString& name, const QModelIndex& index);
-    void canSendSignal(const QString& name, bool flag) const;
+    bool isEditKept();
+    void renameRow(const QString& before, const QString& after);
     bool filterWhileEditing(QEvent* event);
 
-    void initThumbnailArea(const QString& path);
-    void updateThumbnailArea(const QString& path);
-    void clearThumbnailArea();
-
-    FolderPickerController mController;
-    FolderPickerFactory* mFactory;
-    KSTreeModel* mModel;
+    FolderRows mRows;
     KSTreeView* mTree = nullptr;
+    std::unique_ptr<FolderNameEdit> mEdit;
     KSPushbutton* mButtons[ButtonCount] = {};
     QLabel* mTitle = nullptr;
-    QLabel* mThumbnail = nullptr;
-    QLabel* mSizeLabel = nullptr;
+    std::unique_ptr<TitlePreview> mPreview;
     QWidget* mOpacity = nullptr;
     DialogMasks mMasks;
     QPixmap mBackground;
-    QFont mItemFont;
-
-    QString mRootPath;
+    QImage mSeparator;
     QString mUntitled;
-    QString mCurrentFolderName;
-    QPersistentModelIndex mPressedIndex;
     bool mKeepDialog = false;
-
-    QPointer<FolderEditor> mEditor;
-    QPersistentModelIndex mEditIndex;
-    FolderEdit mAction = FOLDER_EDIT_NONE;
-    bool mEditing = false;
-    bool mNameValid = true;
-    bool mCommitted = false; // the text of this edit has reached the disk
-    bool mMessageUp = false; // the box that tells of a name in use
-    QString mOldName;
-    QString mFullName;        // what is being typed
-    QString mDuplicateSource; // full path
 };

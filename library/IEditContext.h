@@ -19,6 +19,8 @@ public:
     // The one context, not owned. Null is allowed and means that nobody asked for anything. GUI thread.
     static IEditContext* instance() { return sInstance; }
     static void setInstance(IEditContext* context) { sInstance = context; }
+    // isCreateNew of the one context; false without one.
+    static bool isCreateNewNow() { return sInstance && sInstance->isCreateNew(); }
 
 private:
     inline static IEditContext* sInstance = nullptr;

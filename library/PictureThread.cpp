@@ -127,7 +127,8 @@ void PictureThread::saveArchiveThumnail(const Archive& archive, const QImage& bi
     // Four fifths of the work are in the big picture, which has a core of its own meanwhile. A picture that
     // cannot be written is kept or passed over: the others still help.
     const std::string title = archive.getPath();
-    std::future<bool> bigSaved = std::async([&] { return PngWriter::saveOrKeep(big, bigPath, title); });
+    std::future<bool> bigSaved =
+        std::async(std::launch::async, [&] { return PngWriter::saveOrKeep(big, bigPath, title); });
     PngWriter::saveOrKeep(middle, middlePath, title);
     ImageResizer resizer;
     resizer.keepRefusedFor(title);

@@ -1,19 +1,28 @@
-// Building and painting of the dialog; see TemplatePickerActions.cpp for what is done with templates.
 #include "library/TemplatePicker.h"
 
 #include "canvas/DrawBoundingRectangle.h"
+#include "canvas/MessageBoxController.h"
 #include "library/ArchiveItem.h"
+#include "library/DialogButtonImages.h"
+#include "library/ListMessages.h"
+#include "library/TemplateItem.h"
 #include "library/TemplateScrollArea.h"
 #include "library/TemplateTab.h"
 #include "library/TitlerTabWidget.h"
+#include "support/ConfinedPath.h"
+#include "support/LogManager.h"
 #include "touchui/KSPushbutton.h"
 #include "touchui/WindowPlaceKeeper.h"
 
 #include <QBitmap>
+#include <QDir>
+#include <QFileInfo>
 #include <QFontMetrics>
 #include <QLabel>
 #include <QPainter>
 #include <QShowEvent>
+#include <memory>
+#include <string>
 
 const QSize TemplatePicker::SCREEN_SIZE(SCREEN_WIDTH, SCREEN_HEIGHT);
 const QSize TemplatePicker::TAB_AREA_SIZE(TAB_AREA_WIDTH, TAB_AREA_HIGHT);
@@ -31,7 +40,7 @@ const int DIALOG_FRAME = 7; // kind of frame
 const int TITLE_FONT_SIZE = 28;
 const int FONT_SIZE = 24;
 const int CAPTION_HEIGHT = 34;
-constexpr QRect MASK_AREA(10, 6, TemplatePicker::SCREEN_WIDTH - 19, TemplatePicker::SCREEN_HEIGHT - 18);
+constexpr QMargins FRAME(10, 6, 9, 12);
 
 // In the dialog.
 const int TABS_LEFT = (TemplatePicker::SCREEN_WIDTH - TemplatePicker::TAB_AREA_WIDTH) / 2;
@@ -44,20 +53,43 @@ const int PANE_TOP = TemplatePicker::TABS_HIGHT + TemplatePicker::PAINS_SPACE;
 const int PANE_WIDTH = TemplatePicker::SCROLL_AREA_WIDTH + 2 * TemplatePicker::PAIN_LINE;
 const int PROPERTY_LEFT = PANE_LEFT + PANE_WIDTH + TemplatePicker::PAINS_SPACE;
 
-const char BUTTON_IMAGES[] =
-    "TextToolPanel_Buttons:Button_48_Rest_Left:Button_48_Rest_Center:Button_48_Rest_Right:"
-    "Button_48_Pressed_Left:Button_48_Pressed_Center:Button_48_Pressed_Right:"
-    "Button_48_Disabled_Left:Button_48_Disabled_Center:Button_48_Disabled_Right:"
-    "Button_48selected_Rest_Left:Button_48selected_Rest_Center:Button_48selected_Rest_Right:"
-    "Button_48selected_Pressed_Left:Button_48selected_Pressed_Center:Button_48selected_Pressed_Right:"
-    "Button_48selected_Disabled_Left:Button_48selected_Disabled_Center:Button_48selected_Disabled_Right";
+const int NOT_FOUND_NUMBER = 400;
+const int WARNING_PRIORITY = 4;
+
+// What stands behind the last "/", if it is not the end.
+QString lastPartOf(const QString& path)
+{
+    return QFileInfo(QDir::cleanPath(path)).fileName();
+}
+
+// The folder that holds the file of this path; a path that ends with "/" is that of the folder.
+QString folderOf(const QString& path)
+{
+    const QString clean = QDir::cleanPath(path);
+    return path.endsWith(QLatin1Char('/')) ? clean : QFileInfo(clean).path();
+}
+
+// The template that a path leads to. Others name any file in its folder, or the folder itself, with a
+// "/" or not; for what does not lead to a template it is the name of the path's folder.
+QString templateNameIn(const TemplateTab& tab, const QString& path)
+{
+    const QString name = lastPartOf(folderOf(path));
+    const QString last = lastPartOf(path);
+    return tab.findTemplateIdFromName(name) == -1 && tab.findTemplateIdFromName(last) != -1 ? last : name;
+}
+
+void logNotFound(const std::wstring& text)
+{
+    LOG_EVENT(L"TemplatePicker", NOT_FOUND_NUMBER, text, WARNING_PRIORITY);
+}
 
 } // namespace
 
 TemplatePicker::TemplatePicker(QWidget* parent)
     : QDialog(parent, Qt::Dialog | Qt::FramelessWindowHint)
     , mReloadRule(SystemSetupDef::emSystemLanguageUnknown, false)
-    , mMasks(this, MASK_AREA)
+    , mSeparator(QStringLiteral(":/Separator_H"))
+    , mMasks(this, FRAME)
 {
     setObjectName(QStringLiteral("TemplateOverview"));
     setStyleSheet(QStringLiteral(" QWidget#TemplateOverview { background:transparent; }"));
@@ -139,7 +171,7 @@ void TemplatePicker::createButtons()
 
 KSPushbutton* TemplatePicker::createButton(QWidget* parent, const QPoint& position, const char* name)
 {
-    auto* button = new KSPushbutton(QString::fromLatin1(BUTTON_IMAGES), parent);
+    auto* button = new KSPushbutton(QString::fromLatin1(DIALOG_BUTTON_IMAGES), parent);
     button->setObjectName(QLatin1String(name));
     button->setStyleSheet(QStringLiteral("color:rgb(220, 220, 220);"));
     button->setGeometry(QRect(position, TOOLBARBTN_SIZE));
@@ -229,7 +261,225 @@ void TemplatePicker::paintEvent(QPaintEvent* event)
 
 void TemplatePicker::drawHorizontalLine(QPainter& painter)
 {
-    const QImage line(QStringLiteral(":/Separator_H"));
-    painter.drawImage(LINE_RECT, line);
-    painter.drawImage(BTMLINE_RECT, line);
+    painter.drawImage(LINE_RECT, mSeparator);
+    painter.drawImage(BTMLINE_RECT, mSeparator);
+}
+
+// --- What the operator and the file manager do with templates ----------------------------------------------
+
+void TemplatePicker::initImageView()
+{
+    mPresetTab->setTemplates(mController.getTemplates(mReloadRule.language(), mPin));
+}
+
+void TemplatePicker::initImageView2()
+{
+    mUserTab->setTemplates(mUserController.getTemplates());
+}
+
+void TemplatePicker::reloadTemplates(SystemSetupDef::emSystemLanguageType language)
+{
+    if (!mReloadRule.needsReload(language, mPin))
+        return;
+    mReloadRule.reloaded(language, mPin);
+    initImageView();
+}
+
+void TemplatePicker::reloadTemplates2()
+{
+    initImageView2();
+}
+
+void TemplatePicker::showUserTemplateTab()
+{
+    mTabs->setCurrentIndex(1);
+    mUserTab->scrollToEnd();
+}
+
+TemplateItem* TemplatePicker::addNewTemplateToLast(Archive* archive)
+{
+    return mUserTab->addNewTemplateToLast(archive);
+}
+
+void TemplatePicker::itemSelected(QPushButton* button)
+{
+    if (auto* item = qobject_cast<TemplateItem*>(button))
+        item->clickTriggered();
+}
+
+void TemplatePicker::triggerSelected(int index, TemplateItem* item)
+{
+    LOG_USER_OPERATE(L"Template Area", 200, L"Select the " + std::to_wstring(index) + L" thumnail");
+    (item->isUser() ? mUserTab : mPresetTab)->select(item);
+}
+
+void TemplatePicker::updateButtons()
+{
+    const bool isUserTab = mTabs->currentIndex() == 1;
+    mSelectButton->setVisible(!isUserTab);
+    mSelectButton2->setVisible(isUserTab);
+    mSelectButton->setEnabled(mPresetTab->selectedItem() != nullptr);
+    mSelectButton2->setEnabled(mUserTab->selectedItem() != nullptr);
+    mDeleteButton2->setEnabled(mUserTab->selectedItem() != nullptr);
+}
+
+void TemplatePicker::updateUserTemplateArea()
+{
+    const Archive* archive = mUserTab->selectedArchive();
+    updateTextObjectArea(archive ? *archive : Archive());
+    updateFilenameArea(archive ? TemplateTab::templateName(*archive) : QString());
+}
+
+void TemplatePicker::updateTextObjectArea(const Archive& archive)
+{
+    mPreviewArchive = archive;
+    mPreview->updateRightChild();
+}
+
+void TemplatePicker::cancelClicked()
+{
+    LOG_USER_OPERATE(L"Template Area", 200, L"Tap Cancel Button");
+    reject();
+}
+
+void TemplatePicker::selectClicked()
+{
+    take(*mPresetTab);
+}
+
+void TemplatePicker::selectClicked2()
+{
+    take(*mUserTab);
+}
+
+void TemplatePicker::take(TemplateTab& tab)
+{
+    Archive* archive = tab.selectedArchive();
+    if (!archive)
+        return;
+    mSelectedItem = true;
+    Q_EMIT selectedTemplate(archive);
+    accept();
+}
+
+void TemplatePicker::deleteClicked2()
+{
+    Q_EMIT signalCloseSoftwareKeyBoardForFileManager();
+    const Archive* archive = mUserTab->selectedArchive();
+    MessageBoxController* messages = MessageBoxController::getInstance();
+    if (!archive || !messages)
+        return;
+    mAskedItem = mUserTab->selectedItem();
+    connect(messages, &MessageBoxController::signalCloseMessage, this,
+            &TemplatePicker::slotDeleteCloseMessage, Qt::UniqueConnection);
+    messages->postMessage(MessageDef::MESSAGE_DELETE_TEMPLATE, TemplateTab::templateName(*archive));
+}
+
+void TemplatePicker::slotDeleteCloseMessage(MessageDefine::tagCloseParam param)
+{
+    if (param.messageId != MessageDef::MESSAGE_DELETE_TEMPLATE)
+        return;
+    if (MessageBoxController* messages = MessageBoxController::getInstance())
+        disconnect(messages, &MessageBoxController::signalCloseMessage, this,
+                   &TemplatePicker::slotDeleteCloseMessage);
+    const bool isAsked = mAskedItem && mAskedItem == mUserTab->selectedItem();
+    mAskedItem.clear();
+    if (param.closeType != MessageDefine::CLOSE_OK || !isAsked)
+        return;
+    const int id = deleteUserTemplate();
+    if (id != -1)
+        mUserTab->removeTemplate(id);
+}
+
+int TemplatePicker::deleteUserTemplate()
+{
+    const Archive* archive = mUserTab->selectedArchive();
+    if (!archive || mUserController.deleteTemplate(archive->getPath()) == 0)
+        return -1;
+    return mUserTab->selectedItem()->getIndex();
+}
+
+void TemplatePicker::overrideTemplate(int id)
+{
+    mUserTab->removeTemplate(id);
+}
+
+int TemplatePicker::findTemplateIdFromName(const QString& name) const
+{
+    return mUserTab->findTemplateIdFromName(name);
+}
+
+void TemplatePicker::slotSaveAsTemplate(QString name)
+{
+    auto archive = std::make_unique<Archive>();
+    const bool isRead = mUserController.loadTemplate(name.toStdString(), archive.get()) != 0;
+    mUserController.addNewTemplateToLastInOrderXml(name.toStdString());
+    TemplateItem* item = addNewTemplateToLast(archive.release());
+    if (isRead)
+        mUserTab->select(item); // what the picker scrolls to
+}
+
+void TemplatePicker::slotImportNewUserTemplate(QString name)
+{
+    if (!mUserController.isTemplatePath(name)) {
+        ConfinedPath::logRefusal(L"a new template is said to be in: ", name.toStdString());
+        return;
+    }
+    if (name.contains(QLatin1Char('/')))
+        name = QFileInfo(name).isDir() ? lastPartOf(name) : templateNameIn(*mUserTab, name);
+    const int id = findTemplateIdFromName(name);
+    if (id != -1)
+        overrideTemplate(id);
+    auto archive = std::make_unique<Archive>();
+    const int result = mUserController.createNewTemplateXml(name.toStdString(), archive.get());
+    if (result < 0)
+        ListMessages::post(MessageDef::MESSAGE_DISK_FULL_ON_TEMPLATE, name);
+    if (result < 1) {
+        // No such folder, or no room: there is nothing to offer, nor is what had the name before.
+        mUserController.removeFromOrderXml(name.toStdString());
+        return;
+    }
+    mUserController.addNewTemplateToLastInOrderXml(name.toStdString());
+    addNewTemplateToLast(archive.release());
+}
+
+void TemplatePicker::slotRenameUserTemplate(QString oldName, QString newName, QString path)
+{
+    LOG_DEBUG_OPERATE(L"TemplatePicker", 200,
+                      L"slotRenameUserTemplate() " + oldName.toStdWString() + L" -> " +
+                          newName.toStdWString());
+    const int id = findTemplateIdFromName(oldName);
+    if (id == -1) {
+        logNotFound(L"slotRenameUserTemplate() \"" + oldName.toStdWString() +
+                    L"\" is not found. cannot rename to \"" + newName.toStdWString() + L"\".");
+        return;
+    }
+    const QString folder = lastPartOf(path) == newName ? QDir::cleanPath(path) : folderOf(path);
+    if (!mUserController.isTemplatePath(folder)) {
+        ConfinedPath::logRefusal(L"a template is said to be in: ", path.toStdString());
+        return;
+    }
+    Archive* archive = mUserTab->archive(id);
+    archive->setName((newName + QStringLiteral("/Titler")).toStdString());
+    archive->setPath((folder + QStringLiteral("/Titler.xml")).toStdString());
+    TemplateItem* item = mUserTab->item(id);
+    item->setImage(archive->getFullPathOfThumbnailSmall());
+    if (item == mUserTab->selectedItem()) {
+        updateFilenameArea(newName);
+        mUserTab->saveSelection();
+    }
+    mUserController.renameInOrderXml(oldName.toStdString(), newName.toStdString());
+}
+
+void TemplatePicker::slotDeleteUserTemplate(QString path)
+{
+    const QString name = templateNameIn(*mUserTab, path);
+    const int id = mUserController.isTemplatePath(path) ? findTemplateIdFromName(name) : -1;
+    if (id == -1) {
+        logNotFound(L"slotDeleteUserTemplate() \"" + name.toStdWString() + L"(" + path.toStdWString() +
+                    L")\" is not found.");
+        return;
+    }
+    overrideTemplate(id);
+    mUserController.reCreateNewOrderXml();
 }

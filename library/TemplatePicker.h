@@ -5,15 +5,16 @@
 #pragma once
 
 #include "document/Archive.h"
-#include "library/DialogMasks.h"
 #include "library/TemplateItem.h"
 #include "library/TemplatePickerController.h"
 #include "library/TemplateReloadRule.h"
 #include "library/UserTemplatePickerController.h"
 #include "messaging/services/MessageDefine.h"
 #include "messaging/services/SystemSetupDef.h"
+#include "touchui/DialogMasks.h"
 
 #include <QDialog>
+#include <QImage>
 #include <QPixmap>
 #include <QPoint>
 #include <QPointer>
@@ -155,5 +156,6 @@ private:
     KSPushbutton* mDeleteButton2 = nullptr;
     KSPushbutton* mCancelButton = nullptr;
     QPixmap mFrame;
+    QImage mSeparator;
     DialogMasks mMasks;
 };

@@ -29,7 +29,6 @@ constexpr int TITLE_LEFT = 19;
 constexpr int GRID_TOP = 56;
 constexpr int ANSWERS_TOP = 275;
 constexpr int ANSWER_SPACING = 20;
-constexpr QColor MASK_COLOR(0, 0, 0, 166);
 constexpr QColor FOCUS_COLOR(0, 129, 255);
 constexpr QColor CORNER_COLOR(30, 30, 30); // beside the round corners of the frame
 constexpr int FOCUS_MARGIN = 3;
@@ -313,35 +312,10 @@ void ColorPalette::drag(const QPoint& global)
 
 void ColorPalette::showDialogMask(bool show)
 {
-    showMask(m_dialogMask, show);
-    setAttribute(Qt::WA_AcceptTouchEvents, !show);
+    m_masks.showDialogMaskWidget(show);
 }
 
 void ColorPalette::showMessageMask(bool show)
 {
-    showMask(m_messageMask, show);
-    const bool isDialogMasked = m_dialogMask && !m_dialogMask->isHidden();
-    setAttribute(Qt::WA_AcceptTouchEvents, !show && !isDialogMasked);
-}
-
-void ColorPalette::showMask(QWidget*& mask, bool show)
-{
-    if (!mask && show)
-        mask = createMask();
-    if (mask)
-        mask->setVisible(show);
-}
-
-QWidget* ColorPalette::createMask()
-{
-    auto* mask = new QWidget(this);
-    mask->setFocusPolicy(Qt::NoFocus);
-    mask->setAttribute(Qt::WA_NoMousePropagation);
-    QPalette maskPalette;
-    maskPalette.setColor(QPalette::Window, MASK_COLOR);
-    mask->setPalette(maskPalette);
-    mask->setAutoFillBackground(true);
-    mask->setGeometry(rect());
-    mask->raise();
-    return mask;
+    m_masks.showMessageMaskWidget(show);
 }

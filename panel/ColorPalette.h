@@ -1,5 +1,6 @@
 #pragma once
 
+#include "touchui/DialogMasks.h"
 #include "touchui/OneFinger.h"
 
 #include <QDialog>
@@ -89,8 +90,6 @@ private:
     void putBack();
     void startDrag(const QPoint& local, const QPoint& global);
     void drag(const QPoint& global);
-    QWidget* createMask();
-    void showMask(QWidget*& mask, bool show);
 
     QList<QString> m_colors;
     QList<ColorButton*> m_buttons;
@@ -106,6 +105,5 @@ private:
     QPoint m_placeAtPress;
     QString m_pressedObjectName;
     QPixmap m_background;
-    QWidget* m_dialogMask = nullptr;
-    QWidget* m_messageMask = nullptr;
+    DialogMasks m_masks{this, QMargins(), DialogMasks::Press::EndsHere};
 };

@@ -1,0 +1,90 @@
+#pragma once
+
+#include "app/EarlyRequests.h"
+#include "app/TitlerToolFactory.h"
+
+// The hand-shake with a service of a sibling process, as all of them have it: the callbacks are registered,
+// the service answers with a client id, and with that the notices are registered. Leaves the service when it
+// is destroyed, if the client id has come. GUI thread.
+template <typename Service>
+class ServiceLink
+{
+public:
+    explicit ServiceLink(long serviceId) : m_serviceId(serviceId) {}
+    ~ServiceLink();
+    ServiceLink(const ServiceLink&) = delete;
+    ServiceLink& operator=(const ServiceLink&) = delete;
+
+    // Blocks until the sibling listens. Does nothing once the client id has come. The callbacks are not owned
+    // and must outlive this object.
+    template <typename CallBack>
+    void connectTo(TitlerToolFactory* factory, CallBack* callBack);
+
+    // Takes the client id that the service gives. greet is called before any request that has waited for the
+    // hand-shakes. The notices are not owned and must outlive this object.
+    template <typename Notify, typename Greeting>
+    void clientIdCame(int id, Notify* notify, Greeting greet);
+    template <typename Notify>
+    void clientIdCame(int id, Notify* notify)
+    {
+        clientIdCame(id, notify, [] {});
+    }
+
+    // False while there is no service to call.
+    explicit operator bool() const { return m_proxy != nullptr; }
+    Service* operator->() const { return m_proxy; }
+    // Returns whether the client id has come.
+    bool isConnected() const { return m_isConnected; }
+    // NO_CLIENT_ID until the service has given one.
+    int clientId() const { return m_clientId; }
+
+    static constexpr int NO_CLIENT_ID = -1;
+
+private:
+    long m_serviceId;
+    Service* m_proxy = nullptr; // owned by the factory
+    int m_clientId = NO_CLIENT_ID;
+    bool m_isConnected = false;
+};
+
+template <typename Service>
+template <typename CallBack>
+void ServiceLink<Service>::connectTo(TitlerToolFactory* factory, CallBack* callBack)
+{
+    if (m_isConnected)
+        return;
+    m_proxy = factory->createService<Service>(m_serviceId);
+    if (!m_proxy)
+        return;
+    EarlyRequests::getInstance()->expectClientId(m_serviceId);
+    m_proxy->registerCallBack(callBack);
+}
+
+template <typename Service>
+template <typename Notify, typename Greeting>
+void ServiceLink<Service>::clientIdCame(int id, Notify* notify, Greeting greet)
+{
+    m_clientId = id;
+    if (m_proxy) {
+        // The services give the same operation two names.
+        if constexpr (requires { m_proxy->unregisterNotify(id); })
+            m_proxy->registerNotify({notify, id});
+        else
+            m_proxy->registerNotifyCallBack({notify, id});
+    }
+    m_isConnected = true;
+    greet();
+    EarlyRequests::getInstance()->clientIdCame(m_serviceId);
+}
+
+template <typename Service>
+ServiceLink<Service>::~ServiceLink()
+{
+    if (!m_proxy || !m_isConnected)
+        return;
+    m_proxy->unregisterCallBack(m_clientId);
+    if constexpr (requires { m_proxy->unregisterNotify(m_clientId); })
+        m_proxy->unregisterNotify(m_clientId);
+    else
+        m_proxy->unregisterNotifyCallBack(m_clientId);
+}

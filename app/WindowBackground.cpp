@@ -1,0 +1,45 @@
+#include "app/WindowBackground.h"
+
+#include "app/TitlerWindow.h"
+#include "canvas/DrawBoundingRectangle.h"
+
+#include <QImageReader>
+#include <QPainter>
+
+namespace
+{
+
+// Kinds of frames.
+constexpr int WINDOW_FRAME = 1;
+constexpr int LEFT_FRAME = 2;
+constexpr QPoint WINDOW_FRAME_POS(8, 8);
+constexpr QPoint LEFT_FRAME_POS(12, 61);
+
+} // namespace
+
+void WindowBackground::makeFrames()
+{
+    DrawBoundingRectangle frames;
+    m_leftFrame = frames.paintBoundingRectangle(LEFT_FRAME);
+    m_windowFrame = frames.paintBoundingRectangle(WINDOW_FRAME);
+}
+
+void WindowBackground::load()
+{
+    QImageReader reader(QStringLiteral(":/PanelBG/Titler_Canvas"));
+    m_canvasSurround = QPixmap::fromImageReader(&reader);
+    m_vertical = QImage(QStringLiteral(":/Separator_V"));
+    m_horizontal = QImage(QStringLiteral(":/Separator_H"));
+}
+
+void WindowBackground::paint(QPainter& painter)
+{
+    if (m_canvasSurround.isNull())
+        load();
+    painter.drawPixmap(WINDOW_FRAME_POS, m_windowFrame);
+    painter.drawPixmap(LEFT_FRAME_POS, m_leftFrame);
+    painter.drawPixmap(TitlerWindow::STARTPOINT_OF_CANVASSCENE_BG, m_canvasSurround);
+    painter.drawImage(TitlerWindow::VSEPARATOR_RECT, m_vertical);
+    painter.drawImage(TitlerWindow::HSEPARATOR_TOP_RECT, m_horizontal);
+    painter.drawImage(TitlerWindow::HSEPARATOR_BOTTOM_RECT, m_horizontal);
+}

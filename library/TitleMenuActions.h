@@ -1,0 +1,82 @@
+#pragma once
+
+#include "library/TitleClipboard.h"
+#include "library/TitleFileOperations.h"
+
+#include <QFont>
+#include <QList>
+#include <QObject>
+#include <QPointer>
+#include <QString>
+#include <memory>
+
+class Archive;
+class ArchiveController;
+class ArchiveItem;
+class ArchiveList;
+class ArchiveMenu;
+class ITitlerAPPEventFilterController;
+class QAction;
+class QPoint;
+class QUndoCommand;
+
+// The option menu of the title list and what its entries do: create, copy, paste and delete titles, and save
+// them as templates. Every change of the list goes out as an undo command. GUI thread.
+class TitleMenuActions : public QObject
+{
+    Q_OBJECT
+
+public:
+    // Neither is owned, and both outlive this object.
+    TitleMenuActions(ArchiveList* list, ArchiveController& controller);
+    ~TitleMenuActions() override;
+
+    // Opens the menu for a title, or with null for the empty area behind the last one. pos lies in the item,
+    // or in the area.
+    void showOptionMenu(ArchiveItem* item, const QPoint& pos, QWidget* area);
+    bool isMenuShowing() const;
+    void hideMenu();
+    // Reports to the siblings whether a popup is open: a press in one of them closes it.
+    void sendTitlerAppEvent(bool open);
+    void setMenuFont(const QFont& font) { m_menuFont = font; }
+    void translateText();
+
+    void selectOptionMenuItem(QAction* action);
+    // As ArchiveList::createArchiveFromTemplate.
+    void createArchiveFromTemplate(Archive* temp);
+    void clearCopyArchive() { m_clipboard.clear(); }
+
+    // The row behind which titles are created and pasted; -1 for none.
+    void setOperationPosition(int position) { m_operationPosition = position; }
+    // The rows, in their order, have left the list.
+    void rowsRemoved(const QList<int>& rows);
+
+Q_SIGNALS:
+    // As the signals of the list.
+    void deleteCommandSignal(QUndoCommand* command);
+    void pasteCommandSignal(QUndoCommand* command);
+    void addUserSignal(QString name);
+    void startTemplatePicker();
+    void startUserTemplatePicker();
+    void archiveListMenuShow();
+    void signalStartPasteArchive();
+    void menuAboutToClose();
+
+private:
+    void createOptionMenu();
+    void exeCreateArchive();
+    void exeCopyArchive();
+    void exePasteArchive();
+    void exeDeleteArchive();
+    void exeAddUserArchive();
+    void emitPasteCommand(std::unique_ptr<Archive> archive);
+
+    ArchiveList* m_list;
+    ArchiveController& m_controller;
+    TitleFileOperations m_files;
+    TitleClipboard m_clipboard;
+    std::unique_ptr<ArchiveMenu> m_menu; // made at first use, a child of the list
+    QFont m_menuFont;
+    QPointer<ITitlerAPPEventFilterController> m_eventController;
+    int m_operationPosition = -1;
+};

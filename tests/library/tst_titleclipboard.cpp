@@ -1,0 +1,75 @@
+// The copied title: it can be pasted again and again, also when its source is gone.
+#include "LibraryFixture.h"
+
+#include "library/TitleClipboard.h"
+
+#include <QTest>
+
+class tst_TitleClipboard : public QObject
+{
+    Q_OBJECT
+
+private Q_SLOTS:
+    void emptyPastesNothing();
+    void copySurvivesItsSource();
+    void laterCopyTakesTheFirstOnesPlace();
+
+private:
+    LibraryFixture mFixture;
+    ArchiveController mController;
+    TitleFileOperations mFiles{mController};
+};
+
+void tst_TitleClipboard::emptyPastesNothing()
+{
+    const QString folder = mFixture.makeFolder(QStringLiteral("empty"));
+    TitleClipboard clipboard;
+    QVERIFY(clipboard.isEmpty());
+    QVERIFY(!clipboard.paste(mFiles, folder));
+    const auto source = LibraryFixture::makeRecord(folder, QStringLiteral("s"), QStringLiteral("Text"));
+    clipboard.copy(*source);
+    QVERIFY(!clipboard.isEmpty());
+    QVERIFY(!clipboard.paste(mFiles, QString()));
+    clipboard.clear();
+    QVERIFY(clipboard.isEmpty());
+    QVERIFY(!clipboard.paste(mFiles, folder));
+    QVERIFY(QDir(folder).entryList(QDir::Files).isEmpty());
+}
+
+void tst_TitleClipboard::copySurvivesItsSource()
+{
+    const QString folder = mFixture.makeFolder(QStringLiteral("copy"));
+    const auto source = LibraryFixture::makeRecord(folder, QStringLiteral("s"), QStringLiteral("Copy me"));
+    LibraryFixture::fillFolder(folder, {QStringLiteral("other")});
+    QVERIFY(mController.saveNewArchive(folder, source.get()));
+    TitleClipboard clipboard;
+    clipboard.copy(*source);
+    QVERIFY(mController.deleteArchive(QString::fromStdString(source->getPath())));
+
+    const auto first = clipboard.paste(mFiles, folder);
+    const auto second = clipboard.paste(mFiles, folder);
+    QVERIFY(first && second);
+    QVERIFY(first->getPath() != second->getPath());
+    for (const Archive* made : {first.get(), second.get()})
+        QVERIFY(QFile::exists(QString::fromStdString(made->getPath())));
+}
+
+void tst_TitleClipboard::laterCopyTakesTheFirstOnesPlace()
+{
+    const QString folder = mFixture.makeFolder(QStringLiteral("later"));
+    const auto first = LibraryFixture::makeRecord(folder, QStringLiteral("a"), QStringLiteral("First"));
+    const auto second = LibraryFixture::makeRecord(folder, QStringLiteral("b"), QStringLiteral("Second"));
+    TitleClipboard clipboard;
+    clipboard.copy(*first);
+    clipboard.copy(*second);
+    const auto pasted = clipboard.paste(mFiles, folder);
+    QVERIFY(pasted);
+    QFile file(QString::fromStdString(pasted->getPath()));
+    QVERIFY(file.open(QIODevice::ReadOnly));
+    const QByteArray text = file.readAll();
+    QVERIFY(text.contains("Second"));
+    QVERIFY(!text.contains("First"));
+}
+
+QTEST_MAIN(tst_TitleClipboard)
+#include "tst_titleclipboard.moc"

@@ -1,0 +1,91 @@
+// The two masks that darken a dialog and keep fingers off it.
+#include "touchui/DialogMasks.h"
+
+#include <QTest>
+#include <QWidget>
+#include <memory>
+
+class tst_DialogMasks : public QObject
+{
+    Q_OBJECT
+
+private Q_SLOTS:
+    void init() { mOwner = std::make_unique<QWidget>(); }
+    void touchesReachTheOwnerWithoutMasks_data();
+    void touchesReachTheOwnerWithoutMasks();
+    void masksAreMadeAtFirstUse();
+    void marginsStayFree();
+    void pressesEndWhereAskedFor();
+
+private:
+    QList<QWidget*> masks() const { return mOwner->findChildren<QWidget*>(); }
+    bool takesTouches() const { return mOwner->testAttribute(Qt::WA_AcceptTouchEvents); }
+
+    std::unique_ptr<QWidget> mOwner;
+};
+
+void tst_DialogMasks::touchesReachTheOwnerWithoutMasks_data()
+{
+    QTest::addColumn<QString>("steps"); // D and M show the masks, d and m hide them
+    QTest::addColumn<bool>("takesTouches");
+    QTest::newRow("dialog") << "D" << false;
+    QTest::newRow("dialog gone") << "Dd" << true;
+    QTest::newRow("message") << "M" << false;
+    QTest::newRow("message gone") << "Mm" << true;
+    QTest::newRow("message over dialog") << "DM" << false;
+    QTest::newRow("message gone over dialog") << "DMm" << false;
+    QTest::newRow("both gone") << "DMmd" << true;
+    QTest::newRow("hidden before shown") << "dm" << true;
+}
+
+void tst_DialogMasks::touchesReachTheOwnerWithoutMasks()
+{
+    QFETCH(QString, steps);
+    DialogMasks both(mOwner.get());
+    for (const QChar step : steps) {
+        if (step.toUpper() == QLatin1Char('D'))
+            both.showDialogMaskWidget(step.isUpper());
+        else
+            both.showMessageMaskWidget(step.isUpper());
+    }
+    QTEST(takesTouches(), "takesTouches");
+}
+
+void tst_DialogMasks::masksAreMadeAtFirstUse()
+{
+    DialogMasks both(mOwner.get());
+    both.showDialogMaskWidget(false);
+    QVERIFY(masks().isEmpty());
+    both.showDialogMaskWidget(true);
+    both.showDialogMaskWidget(false);
+    both.showDialogMaskWidget(true);
+    QCOMPARE(masks().size(), 1);
+    const QWidget* mask = masks().constFirst();
+    QVERIFY(!mask->isHidden());
+    QVERIFY(mask->autoFillBackground());
+    QCOMPARE(mask->focusPolicy(), Qt::NoFocus);
+    QCOMPARE(mask->palette().color(QPalette::Window), QColor(0, 0, 0, 166));
+    both.showMessageMaskWidget(true);
+    QCOMPARE(masks().size(), 2);
+}
+
+void tst_DialogMasks::marginsStayFree()
+{
+    mOwner->resize(300, 200);
+    DialogMasks both(mOwner.get(), QMargins(10, 6, 9, 12));
+    both.showMessageMaskWidget(true);
+    QCOMPARE(masks().constFirst()->geometry(), QRect(10, 6, 281, 182));
+}
+
+void tst_DialogMasks::pressesEndWhereAskedFor()
+{
+    DialogMasks through(mOwner.get());
+    through.showDialogMaskWidget(true);
+    QVERIFY(!masks().constLast()->testAttribute(Qt::WA_NoMousePropagation));
+    DialogMasks here(mOwner.get(), QMargins(), DialogMasks::Press::EndsHere);
+    here.showDialogMaskWidget(true);
+    QVERIFY(masks().constLast()->testAttribute(Qt::WA_NoMousePropagation));
+}
+
+QTEST_MAIN(tst_DialogMasks)
+#include "tst_dialogmasks.moc"
