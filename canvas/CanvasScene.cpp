@@ -5,6 +5,7 @@
 #include "canvas/EditTextCommand.h"
 #include "canvas/GraphicsPixmap.h"
 #include "canvas/ICanvasHost.h"
+#include "canvas/InputLanguageFonts.h"
 #include "canvas/MessageBoxController.h"
 #include "canvas/MoveItemCommand.h"
 #include "canvas/NewTextStyle.h"
@@ -12,6 +13,7 @@
 #include "canvas/SaveOutage.h"
 #include "canvas/SoftKeyboardField.h"
 #include "canvas/StyleComparison.h"
+#include "canvas/TextObjectConstants.h"
 #include "canvas/TextObjectList.h"
 #include "document/Archive.h"
 #include "document/CanvasController.h"
@@ -32,6 +34,8 @@
 #include <QTextDocument>
 #include <algorithm>
 #include <cmath>
+
+using namespace TextObjectConstants;
 
 namespace
 {
@@ -327,7 +331,8 @@ int CanvasScene::initCGraphicsTextItem()
 
 int CanvasScene::initItemLastAlphaStyleWithLastTextStyle(TText& record)
 {
-    const QString ofLanguage = GraphicsText::LAST_KEEPED_FONT[size_t(m_languageRow)][GraphicsText::Asian];
+    const QString ofLanguage =
+        InputLanguageFonts::LAST_KEEPED_FONT[size_t(m_languageRow)][InputLanguageFonts::Asian];
     QString family;
     int ensureMode = 2;
     if (m_panelTold) {
@@ -442,21 +447,20 @@ void CanvasScene::slotChangeObjectTextStyle(TText* style, int id, int undoFlag)
     if (!style || style->textItems().empty())
         return;
     GraphicsText* item = m_texts->findTheActiveItem();
-    takeBackPreviews(undoFlag == GraphicsText::CancelledChange ? nullptr : item);
-    if (undoFlag == GraphicsText::CancelledChange) {
+    takeBackPreviews(undoFlag == CancelledChange ? nullptr : item);
+    if (undoFlag == CancelledChange) {
         m_thumbnailNeeded = true;
         return;
     }
-    if (undoFlag == GraphicsText::CommittedChange)
+    if (undoFlag == CommittedChange)
         m_newTextStyle->rememberChange(*style);
     const bool same = isTheSame(style);
     if (!item)
         return;
     m_languageChanged = false;
-    if (id == GraphicsText::PropertyFamily)
+    if (id == PropertyFamily)
         m_cnFamilyFlag = false;
-    const bool overall = id == GraphicsText::PropertyShadow || id == GraphicsText::PropertyAlign ||
-                         id == GraphicsText::PropertyPosition;
+    const bool overall = id == PropertyShadow || id == PropertyAlign || id == PropertyPosition;
     const int mode = getItemTextEditId(item->getStatusId(), overall, same);
     changeItemTextStyleAccordingToItemStatus(item, style, id, mode, overall, undoFlag);
 }
@@ -547,7 +551,7 @@ void CanvasScene::deleteSelectedItems()
     endPreview();
     const QList<GraphicsText*> texts = m_texts->enabledTexts();
     for (GraphicsText* item : texts) {
-        if (item->getBoundingLineStatus() != GraphicsText::FocusNone && !item->isBlank())
+        if (item->getBoundingLineStatus() != FocusNone && !item->isBlank())
             pushDeleteCommand(item);
     }
     update();
@@ -701,21 +705,21 @@ void CanvasScene::setModuleInfo(SystemSetupDef::emInformationModel model)
     const bool china = model == SystemSetupDef::emInformationModelChina;
     m_module = china ? 1 : 0;
     m_cnFamilyFlag = china;
-    GraphicsText::IS_CN_MODULE = china;
+    InputLanguageFonts::IS_CN_MODULE = china;
     resetLastFontInfo();
 }
 
 void CanvasScene::resetLastFontInfo()
 {
     if (m_module == 1)
-        GraphicsText::fillLastFonts(FAMILY_FOR_CN_MODULE);
+        InputLanguageFonts::fillLastFonts(FAMILY_FOR_CN_MODULE);
     else
-        GraphicsText::resetLastFonts();
+        InputLanguageFonts::resetLastFonts();
 }
 
 void CanvasScene::slotSceneInputLanguageChanged(SystemSetupDef::emInputLanguageType language)
 {
-    const int row = GraphicsText::languageRow(language);
+    const int row = InputLanguageFonts::languageRow(language);
     m_languageChanged = m_languageChanged || row != m_languageRow;
     m_languageRow = row;
     resetLastFontInfo();

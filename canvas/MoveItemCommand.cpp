@@ -1,8 +1,6 @@
 #include "canvas/MoveItemCommand.h"
 
 #include "canvas/CanvasScene.h"
-#include "canvas/StyleDocument.h"
-#include "document/TText.h"
 
 MoveItemCommand::MoveItemCommand(CanvasScene* scene, int id, QPointF oldPosition, QPointF newPosition,
                                  QUndoCommand* parent)
@@ -20,13 +18,7 @@ void MoveItemCommand::moveTo(QPointF position)
     m_scene->saveArchiveFlag();
     GraphicsText* item = m_title.isShown() ? m_scene->findTextItem(m_objectId) : nullptr;
     if (item) {
-        item->getItemTText()->setXValue(float(position.x()));
-        item->getItemTText()->setYValue(float(position.y()));
-        if (GraphicsText* parent = item->parentTextItem())
-            parent->setPos(position);
-        item->setPos(0.0, 0.0);
-        // The next change of style starts from this place.
-        item->styles().refreshUndoBaseline();
+        item->placeAt(position);
         item->changeItemToSolidLineState();
     }
     m_scene->update();

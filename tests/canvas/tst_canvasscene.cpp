@@ -322,8 +322,8 @@ void tst_canvasscene::chinaModel()
 {
     Canvas canvas;
     canvas.scene->setModuleInfo(SystemSetupDef::emInformationModelChina);
-    QVERIFY(GraphicsText::IS_CN_MODULE);
-    for (const auto& row : GraphicsText::LAST_KEEPED_FONT) {
+    QVERIFY(InputLanguageFonts::IS_CN_MODULE);
+    for (const auto& row : InputLanguageFonts::LAST_KEEPED_FONT) {
         for (const QString& family : row)
             QCOMPARE(family, QStringLiteral("DFHeiW5-A"));
     }
@@ -339,8 +339,8 @@ void tst_canvasscene::chinaModel()
         canvas.scene->getTextItemList().last()->getLastAlpaTextStyleValue()->textItems()[0]->getFontFamily(),
         std::string("DejaVu Sans"));
     canvas.scene->setModuleInfo(SystemSetupDef::emInformationModelDefault);
-    QVERIFY(!GraphicsText::IS_CN_MODULE);
-    QVERIFY(GraphicsText::LAST_KEEPED_FONT == GraphicsText::LANGUAGE_DEFAULT_FONT);
+    QVERIFY(!InputLanguageFonts::IS_CN_MODULE);
+    QVERIFY(InputLanguageFonts::LAST_KEEPED_FONT == InputLanguageFonts::LANGUAGE_DEFAULT_FONT);
 }
 
 void tst_canvasscene::modeTable_data()
