@@ -1,5 +1,7 @@
 #include "CanvasFixture.h"
 
+#include "canvas/StyleDispatch.h"
+
 // The canvas: titles, objects, style changes, undo, touch and keyboard.
 class tst_canvasscene : public QObject
 {
@@ -368,7 +370,7 @@ void tst_canvasscene::modeTable()
     QFETCH(bool, overall);
     QFETCH(bool, same);
     QFETCH(int, mode);
-    QCOMPARE(CanvasScene::getItemTextEditId(status, overall, same), mode);
+    QCOMPARE(StyleDispatch::getItemTextEditId(status, overall, same), mode);
 }
 
 void tst_canvasscene::styleOfSelectedObject()
