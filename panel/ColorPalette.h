@@ -106,6 +106,7 @@ private:
     QPoint m_placeAtPress;
     QString m_pressedObjectName;
     QPixmap m_background;
+    QPixmap m_separator;
     QWidget* m_dialogMask = nullptr;
     QWidget* m_messageMask = nullptr;
 };
