@@ -8,6 +8,7 @@
 #include "canvas/GraphicsView.h"
 #include "canvas/IThumbnailRender.h"
 #include "canvas/StyleDocument.h"
+#include "canvas/TextObjectConstants.h"
 
 #include <QApplication>
 #include <QGraphicsPixmapItem>
@@ -154,7 +155,7 @@ void changeStyle(benchmark::State& state)
                        withBold(*canvas.text->getItemTText(), false)};
     int turn = 0;
     for ([[maybe_unused]] auto _ : state) {
-        canvas.scene.slotChangeObjectTextStyle(&sources[turn], GraphicsText::PropertyBold, 1);
+        canvas.scene.slotChangeObjectTextStyle(&sources[turn], TextObjectConstants::PropertyBold, 1);
         turn = 1 - turn;
         if (!canvas.text->textCursor().hasSelection()) {
             state.SkipWithError("the selection is gone");
@@ -168,7 +169,7 @@ void undoStyle(benchmark::State& state)
     Canvas canvas(PlainText);
     TText source = withBold(*canvas.text->getItemTText(), true);
     selectAll(*canvas.text);
-    canvas.scene.slotChangeObjectTextStyle(&source, GraphicsText::PropertyBold, 1);
+    canvas.scene.slotChangeObjectTextStyle(&source, TextObjectConstants::PropertyBold, 1);
     for ([[maybe_unused]] auto _ : state) {
         canvas.stack.undo();
         state.PauseTiming();
@@ -195,7 +196,7 @@ std::vector<PlainRun> runsOf(const TText& record)
         TextStyle changed = *style;
         for (const int bold : {0, 1}) {
             changed.setFontBold(bold);
-            run.formats[bold].setFont(CharacterFormat::font(changed, GraphicsText::SCENEPERCENTAGE));
+            run.formats[bold].setFont(CharacterFormat::font(changed, TextObjectConstants::SCENEPERCENTAGE));
             run.formats[bold].setForeground(CharacterFormat::color(style->getFontColor()));
         }
         if (runs.empty() || runs.back().formats[0] != run.formats[0])

@@ -103,7 +103,7 @@ void typeInPlainItem(benchmark::State& state)
     QTextCursor cursor(item->document());
     for (const TextStyle* style : record->textItems()) {
         QTextCharFormat format;
-        format.setFont(CharacterFormat::font(*style, GraphicsText::SCENEPERCENTAGE));
+        format.setFont(CharacterFormat::font(*style, TextObjectConstants::SCENEPERCENTAGE));
         format.setForeground(CharacterFormat::color(style->getFontColor()));
         cursor.insertText(QString::fromStdString(style->getText()), format);
     }

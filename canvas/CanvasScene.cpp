@@ -5,41 +5,46 @@
 #include "canvas/EditTextCommand.h"
 #include "canvas/GraphicsPixmap.h"
 #include "canvas/ICanvasHost.h"
+#include "canvas/InputLanguageFonts.h"
 #include "canvas/MessageBoxController.h"
 #include "canvas/MoveItemCommand.h"
 #include "canvas/NewTextStyle.h"
 #include "canvas/SafeAreaLines.h"
-#include "canvas/SaveOutage.h"
+#include "canvas/SceneKeyboard.h"
+#include "canvas/ShownTitle.h"
 #include "canvas/SoftKeyboardField.h"
 #include "canvas/StyleComparison.h"
+#include "canvas/StyleDispatch.h"
+#include "canvas/TextObjectConstants.h"
 #include "canvas/TextObjectList.h"
+#include "canvas/TextPairMaker.h"
 #include "document/Archive.h"
 #include "document/CanvasController.h"
 #include "document/FontStyle.h"
+#include "document/PngWriter.h"
 #include "document/TText.h"
 #include "support/LogManager.h"
-#include "touchui/KSInputContext.h"
 
 #include <QAction>
 #include <QCoreApplication>
-#include <QFileInfo>
 #include <QGraphicsSceneMouseEvent>
 #include <QGraphicsView>
 #include <QInputMethodEvent>
 #include <QMetaMethod>
 #include <QPainter>
+#include <QPixmap>
 #include <QTextCursor>
 #include <QTextDocument>
 #include <algorithm>
 #include <cmath>
+
+using namespace TextObjectConstants;
 
 namespace
 {
 
 constexpr int SafeAreaAboveTexts = 4;
 constexpr double SamePlace = 1e-12;
-// More steps than objects could need to leave a free place.
-constexpr int MaximumCascade = 1000;
 
 } // namespace
 
@@ -48,26 +53,24 @@ const QString CanvasScene::FAMILY_FOR_CN_MODULE = QStringLiteral("DFHeiW5-A");
 
 CanvasScene::CanvasScene(std::unique_ptr<IThumbnailRender> render, QObject* parent)
     : QGraphicsScene(parent)
-    , m_controller(std::make_unique<CanvasController>())
-    , m_defaultFontStyle(std::make_unique<FontStyle>())
-    , m_thumbnailRender(std::move(render))
+    , m_pairs(std::make_unique<TextPairMaker>(*this))
+    , m_keyboard(std::make_unique<SceneKeyboard>())
     , m_texts(std::make_unique<TextObjectList>(*this))
     , m_safeArea(std::make_unique<SafeAreaLines>(*this))
 {
     // A handful of items that change their size with every key: an index costs more than it saves.
     setItemIndexMethod(NoIndex);
-    SaveOutage::instance(); // from here on titles may be saved
-    m_controller->getTextStyle(m_defaultFontStyle.get());
-    m_newTextStyle = std::make_unique<NewTextStyle>(tr("Title goes here"), *m_defaultFontStyle);
-    if (m_thumbnailRender) {
-        connect(m_thumbnailRender.get(), &IThumbnailRender::saveHalfThumbnailsOK, this,
-                &CanvasScene::signalSaveOk);
-    }
+    if (render)
+        connect(render.get(), &IThumbnailRender::saveHalfThumbnailsOK, this, &CanvasScene::signalSaveOk);
+    m_title = std::make_unique<ShownTitle>(std::move(render));
+    FontStyle remembered;
+    CanvasController().getTextStyle(&remembered);
+    m_newTextStyle = std::make_unique<NewTextStyle>(tr("Title goes here"), remembered);
 }
 
 CanvasScene::~CanvasScene()
 {
-    // Items report to this class while they go.
+    // Items report to this class while they are destroyed.
     blockSignals(true);
     for (GraphicsText* item : std::as_const(*m_texts).listed())
         item->disconnect(this);
@@ -77,10 +80,10 @@ CanvasScene::~CanvasScene()
 
 const Archive* CanvasScene::archive() const
 {
-    return m_archive.get();
+    return m_title->archive();
 }
 
-// Showing a title; see CanvasSceneSaving.cpp for saving one
+// Showing a title
 
 void CanvasScene::savePreviousArchiveInfo()
 {
@@ -97,13 +100,13 @@ void CanvasScene::savePreviousArchiveInfo()
     removeAllItems();
 }
 
-// The pointers go before what they point to.
+// The pointers are cleared before what they point to is destroyed.
 void CanvasScene::removeAllItems()
 {
     m_texts->listed().clear();
     m_safeArea->forget();
     m_currentPixmapItem = nullptr;
-    m_itemForKeyboard = nullptr;
+    m_keyboard->setItem(nullptr);
     QGraphicsScene::clear();
 }
 
@@ -127,7 +130,7 @@ void CanvasScene::clearCanvas()
 {
     endPreview();
     removeAllItems();
-    m_archive.reset();
+    m_title->forget();
 }
 
 bool CanvasScene::archiveIsNull(const Archive* archive)
@@ -135,7 +138,7 @@ bool CanvasScene::archiveIsNull(const Archive* archive)
     if (archive)
         return false;
     // A later save must not empty the title that was shown before.
-    m_archive.reset();
+    m_title->forget();
     if (m_drawSafeArea)
         drawSafeAreaRect();
     Q_EMIT signalDisableNewTextButton(true);
@@ -148,69 +151,46 @@ void CanvasScene::slotUpdateArchive(const Archive* archive)
     const auto previous = m_currentPixmapItem ? m_currentPixmapItem->source() : nullptr; // a paste shares it
     savePreviousArchiveInfo();
     // A text that was being typed until now is in no picture yet.
-    if (m_archive && (!archive || archive->getPath() != m_archive->getPath()))
+    const Archive* before = m_title->archive();
+    if (before && (!archive || archive->getPath() != before->getPath()))
         slotMakeSceneThumnail();
     if (archiveIsNull(archive))
         return;
-    if (archive != m_archive.get())
-        m_archive = std::make_unique<Archive>(*archive);
+    m_title->show(*archive);
     Q_EMIT signalDisableNewTextButton(false);
     resetLastFontInfo();
-    const QString background = m_archive->getFullPathOfBgResource();
+    const Archive& shown = *m_title->archive();
+    const QString background = shown.getFullPathOfBgResource();
     if (!background.isEmpty()) {
-        addCGraphicsPixmapItem(background, QPointF(m_archive->getBgPointX(), m_archive->getBgPointY()),
-                               m_archive->getBgPointZ());
+        addCGraphicsPixmapItem(background, QPointF(shown.getBgPointX(), shown.getBgPointY()),
+                               shown.getBgPointZ());
     }
-    for (TText* record : m_archive->getText()) {
-        if (record)
-            buildPair(record);
+    for (TText* record : shown.getText()) {
+        if (!record)
+            continue;
+        InputLanguageFonts::mInputLanguage = m_newTextStyle->languageRow();
+        addText(m_pairs->make(*record));
     }
     m_topZ = int(m_texts->maxZValue());
     reportMissingFamily();
-    if (m_thumbnailRender && lacksPictures())
-        m_thumbnailRender->makeThumbnail(m_archive.get(), true);
+    m_title->makeLackingPictures();
     if (m_drawSafeArea)
         drawSafeAreaRect();
 }
 
-GraphicsText* CanvasScene::buildPair(TText* record)
+void CanvasScene::addText(GraphicsText* item)
 {
-    auto* parent = new GraphicsText(true, nullptr, this);
-    auto* child = new GraphicsText(record, 0, parent, nullptr);
-    const TText& shown = *child->getItemTText();
-    parent->setPos(shown.getXValue(), shown.getYValue());
-    parent->setZValue(shown.getZValue());
-    child->setZValue(shown.getZValue());
-    connectSignalAndSlot(child);
-    child->setInputLanguage(m_languageRow);
-    child->setPos(0.0, 0.0);
-    child->initShowText();
-    m_texts->listed().append(child);
-    m_currentItem = child;
-    m_currentParentItem = parent;
-    return child;
+    m_texts->listed().append(item);
+    m_currentItem = item;
 }
 
 GraphicsText* CanvasScene::rebuildItem(TText* record, TText& lastAlpha)
 {
     if (GraphicsText* old = findTextItem(record->getTextObjectID()))
         deleteItem(old); // came back with a file that could not be written without it
-    auto* parent = new GraphicsText(true, nullptr, this);
-    parent->setPos(record->getXValue(), record->getYValue());
-    parent->setZValue(record->getZValue());
-    auto* child = new GraphicsText(false, parent, nullptr);
-    connectSignalAndSlot(child);
-    child->setLastAlpaTextStyleValue(lastAlpha);
-    child->resetDocument(record, 0);
-    QList<GraphicsText*> items = getTextItemList();
-    items.append(child);
-    setTextItemList(items);
-    child->setPos(0.0, 0.0);
-    child->setZValue(record->getZValue());
-    child->changeItemToSolidLineState();
-    m_currentItem = child;
-    m_currentParentItem = parent;
-    return child;
+    addText(m_pairs->make(*record, lastAlpha, NewTextStyle::FirstCharacter().ensureMode));
+    m_currentItem->changeItemToSolidLineState();
+    return m_currentItem;
 }
 
 void CanvasScene::reportMissingFamily()
@@ -226,7 +206,7 @@ void CanvasScene::reportMissingFamily()
     if (MessageBoxController* messages = MessageBoxController::getInstance())
         messages->postMessage(MessageDef::MESSAGE_FONT_MISSING, m_missingFamily);
     saveArchive();
-    m_thumbnailNeeded = true;
+    saveArchiveFlag();
 }
 
 void CanvasScene::addCGraphicsPixmapItem(const QString& path, QPointF position, double z)
@@ -257,7 +237,7 @@ void CanvasScene::addCGraphicsTextItem()
     endPreview();
     if (itemIsEditorInteraction()) {
         saveArchive();
-        m_thumbnailNeeded = true;
+        saveArchiveFlag();
         clearItemsSelectionAndFocus();
     } else if (itemIsSelectionMode()) {
         clearItemsSelectionMode();
@@ -271,7 +251,7 @@ void CanvasScene::addCGraphicsTextItem()
             messages->postMessage(MessageDef::MESSAGE_TEXT_OBJECT_LIMIT);
         return;
     }
-    m_panelTold = false;
+    m_newTextStyle->askPanel();
     Q_EMIT signalBeginNewTextItem();
     auto* command = new CreateItemCommand(this);
     const bool made = command->objectId() >= 0;
@@ -279,7 +259,7 @@ void CanvasScene::addCGraphicsTextItem()
     Q_EMIT signalTextInserted();
     if (!made || !m_currentItem)
         return;
-    m_newTextFlag = 1;
+    m_keyboard->expectNewText();
     m_currentItem->initNewTextSelectAll();
     Q_EMIT signalSceneNotifyIfExistSelectedObject(true);
     Q_EMIT signalSceneNotifyTextPropertyAreaObjectSelectionMode(false, false);
@@ -291,73 +271,12 @@ int CanvasScene::initCGraphicsTextItem()
     const int id = m_texts->freeId(MAX_TEXT_OBJECTS);
     if (id < 0)
         return id;
-    TText record;
-    record.setText(std::string());
-    m_newTextStyle->applyTo(record);
-    record.setTextObjectID(id);
-    const QPointF place = getInitItemScenePosition();
-    record.setXValue(float(place.x()));
-    record.setYValue(float(place.y()));
+    setSafeAreaRectLineZValue(-1); // it would hide what lies under it
+    const QPointF place = m_pairs->getInitItemScenePosition();
     m_topZ = int(m_texts->maxZValue()) + 1;
-    record.setZValue(float(m_topZ));
-
-    auto* parent = new GraphicsText(true, nullptr, this);
-    auto* child = new GraphicsText(&record, 0, parent, nullptr);
-    parent->setPos(place);
-    parent->setZValue(m_topZ);
-    child->setZValue(m_topZ);
-    connectSignalAndSlot(child);
-    child->setInputLanguage(m_languageRow);
-    TText lastAlpha;
-    const int ensureMode = initItemLastAlphaStyleWithLastTextStyle(lastAlpha);
-    child->setLastAlpaTextStyleValue(lastAlpha);
-    child->setFontFamilyEnsureMode(ensureMode);
-    child->initShowText();
-    m_texts->listed().append(child);
-    m_currentItem = child;
-    m_currentParentItem = parent;
-
-    const QRectF area = parent->layoutRect();
-    parent->moveBy(-area.width() / 2.0, -area.height() / 2.0);
-    child->getItemTText()->setXValue(float(parent->x()));
-    child->getItemTText()->setYValue(float(parent->y()));
+    addText(m_pairs->makeNew(id, place, m_topZ, *m_newTextStyle));
     setSafeAreaRectLineZValue(m_topZ + SafeAreaAboveTexts);
     return id;
-}
-
-int CanvasScene::initItemLastAlphaStyleWithLastTextStyle(TText& record)
-{
-    const QString ofLanguage = GraphicsText::LAST_KEEPED_FONT[size_t(m_languageRow)][GraphicsText::Asian];
-    QString family;
-    int ensureMode = 2;
-    if (m_panelTold) {
-        // What the panel shows holds. It shows the family of a new language until a text is selected.
-        if (m_languageChanged && m_newTextStyle->family() == ofLanguage)
-            ensureMode = 1;
-    } else if (m_cnFamilyFlag) {
-        family = FAMILY_FOR_CN_MODULE;
-        ensureMode = 0;
-    } else if (m_languageChanged) {
-        family = ofLanguage;
-        ensureMode = 1;
-    }
-    m_languageChanged = false;
-    record = m_newTextStyle->firstCharacter(family);
-    return ensureMode;
-}
-
-QPointF CanvasScene::getInitItemScenePosition()
-{
-    setSafeAreaRectLineZValue(-1);
-    QPointF place = sceneRect().center();
-    for (int i = 0; i < MaximumCascade; ++i) {
-        const QGraphicsItem* under = itemAt(place, QTransform());
-        if (!under || under->type() != GraphicsText::Type)
-            break;
-        place += QPointF(OFFSET, -OFFSET);
-    }
-    setSafeAreaRectLineZValue(m_topZ + SafeAreaAboveTexts);
-    return place;
 }
 
 // Items
@@ -384,33 +303,7 @@ void CanvasScene::setTextItemList(const QList<GraphicsText*>& items)
 
 void CanvasScene::connectSignalAndSlot(GraphicsText* item)
 {
-    using Text = GraphicsText;
-    const QTextDocument* document = item->document();
-    connect(item, &Text::signalSoftWareClosedWhenEditObject, this,
-            &CanvasScene::signalSceneSoftWareClosedWhenEditObject);
-    connect(item, &Text::signalNotifyIfExistSelectedObject, this,
-            &CanvasScene::signalSceneNotifyIfExistSelectedObject);
-    connect(item, &Text::signalGetSceneInputLanguage, this, &CanvasScene::slotSetItemInputlanguage);
-    connect(item, &Text::signalObjectHasLostFocus, this, &CanvasScene::slotObjectLostFocus);
-    connect(item, &Text::signalObjectSelectedHasChanged, this, &CanvasScene::signalItemSelected);
-    connect(document, &QTextDocument::contentsChange, item, &Text::slotObjectDocumentChange);
-    connect(item, &Text::signalNotifyPropertyAreaObjectSelectionStyleChange, this,
-            &CanvasScene::signalNotifyPropertyAreaUpdateCurrentTextStyle);
-    connect(document, &QTextDocument::contentsChange, this, &CanvasScene::slotObjectContentsChange);
-    connect(item, &Text::xChanged, item, &Text::slotObjectPositionChanged);
-    connect(item, &Text::yChanged, item, &Text::slotObjectPositionChanged);
-    connect(item, &Text::signalObjectPositionChanged, this, &CanvasScene::slotCreateMoveUndoCommand);
-    connect(item, &Text::signalNotifySceneCurrentMousePressedObjectId, this,
-            &CanvasScene::slotSetCurrentMousePressedObjectId);
-    connect(item, &Text::signalObjectContentsEdited, this, &CanvasScene::slotCreateEditUndoCommand);
-    connect(item, &Text::signalNotifySceneCurrentObjectInEditMode, this, &CanvasScene::slotSendCustomEvent);
-    connect(item, &Text::signalNotifyTextPropertyAreaObjectSelectionMode, this,
-            &CanvasScene::signalSceneNotifyTextPropertyAreaObjectSelectionMode);
-    connect(item, &Text::signalSaveArchive, this, &CanvasScene::slotSaveArchive);
-    connect(item, &Text::signalEndPreview, this, &CanvasScene::endPreview);
-    connect(item, &Text::signalDeleteItem, this, &CanvasScene::slotDeleteEmptyItems);
-    connect(item, &Text::signalShowMessageWhenUsingDefaultFont, this,
-            &CanvasScene::slotShowMessageWhenUsingDefaultFont);
+    m_pairs->connectToScene(item);
 }
 
 // Style changes
@@ -420,72 +313,23 @@ bool CanvasScene::isTheSame(TText* style) const
     return StyleComparison::isTheSame(*style);
 }
 
-int CanvasScene::getItemTextEditId(int status, bool overall, bool same)
-{
-    switch (status) {
-    case 0:
-        return ALL_STYLE_CHANGED_WHEN_SELECTION_MODE;
-    case 1:
-        return overall ? ALL_STYLE_CHANGED_WHEN__HAS_SELECTION_MODE
-                       : PART_STYLE_CHANGED_WHEN_HAS_SELECTION_MODE;
-    case 2:
-        if (!same)
-            return NO_EDIT_MODE;
-        return overall ? ALL_STYLE_CHANGED_WHEN_EDIT_MODE : STYLE_SAVED_FOR_NEXT_INSER_MODE;
-    default:
-        return NO_EDIT_MODE;
-    }
-}
-
 void CanvasScene::slotChangeObjectTextStyle(TText* style, int id, int undoFlag)
 {
     if (!style || style->textItems().empty())
         return;
     GraphicsText* item = m_texts->findTheActiveItem();
-    takeBackPreviews(undoFlag == GraphicsText::CancelledChange ? nullptr : item);
-    if (undoFlag == GraphicsText::CancelledChange) {
-        m_thumbnailNeeded = true;
+    takeBackPreviews(undoFlag == CancelledChange ? nullptr : item);
+    if (undoFlag == CancelledChange) {
+        saveArchiveFlag();
         return;
     }
-    if (undoFlag == GraphicsText::CommittedChange)
+    if (undoFlag == CommittedChange)
         m_newTextStyle->rememberChange(*style);
-    const bool same = isTheSame(style);
     if (!item)
         return;
-    m_languageChanged = false;
-    if (id == GraphicsText::PropertyFamily)
-        m_cnFamilyFlag = false;
-    const bool overall = id == GraphicsText::PropertyShadow || id == GraphicsText::PropertyAlign ||
-                         id == GraphicsText::PropertyPosition;
-    const int mode = getItemTextEditId(item->getStatusId(), overall, same);
-    changeItemTextStyleAccordingToItemStatus(item, style, id, mode, overall, undoFlag);
-}
-
-void CanvasScene::changeItemTextStyleAccordingToItemStatus(GraphicsText* item, TText* style, int id, int mode,
-                                                           bool overall, int undoFlag)
-{
-    switch (mode) {
-    case ALL_STYLE_CHANGED_WHEN_SELECTION_MODE:
-        item->changeAllStyleWhenSelectionMode(style, id, overall, undoFlag);
-        break;
-    case ALL_STYLE_CHANGED_WHEN_EDIT_MODE:
-        item->changeAllStyleWhenEditMode(style, id, overall, undoFlag);
-        break;
-    case ALL_STYLE_CHANGED_WHEN__HAS_SELECTION_MODE:
-        item->changeAllStyleWhenHasSelection(style, id);
-        break;
-    case PART_STYLE_CHANGED_WHEN_HAS_SELECTION_MODE:
-        item->changePartStyleWhenHasSelection(style, id, undoFlag);
-        break;
-    case STYLE_SAVED_FOR_NEXT_INSER_MODE:
-        item->saveStyleForNextInsert(&m_newTextStyle->lastTextStyle(), undoFlag, id);
-        item->setTextInteractionFlags(Qt::TextEditorInteraction);
-        item->setFocus();
-        return;
-    default:
-        break;
-    }
-    m_thumbnailNeeded = true;
+    m_newTextStyle->propertyChanged(id);
+    if (StyleDispatch::apply(*item, *style, id, undoFlag, *m_newTextStyle))
+        saveArchiveFlag();
 }
 
 void CanvasScene::takeBackPreviews(const GraphicsText* except)
@@ -506,7 +350,6 @@ void CanvasScene::endPreview()
 void CanvasScene::slotUpdateCurrentTextProperty(TText& style)
 {
     m_newTextStyle->rememberProperty(style);
-    m_panelTold = true;
 }
 
 // Undo commands
@@ -547,7 +390,7 @@ void CanvasScene::deleteSelectedItems()
     endPreview();
     const QList<GraphicsText*> texts = m_texts->enabledTexts();
     for (GraphicsText* item : texts) {
-        if (item->getBoundingLineStatus() != GraphicsText::FocusNone && !item->isBlank())
+        if (item->getBoundingLineStatus() != FocusNone && !item->isBlank())
             pushDeleteCommand(item);
     }
     update();
@@ -654,6 +497,69 @@ void CanvasScene::focusOutEvent(QFocusEvent* event)
         QGraphicsScene::focusOutEvent(event);
 }
 
+// Saving
+
+void CanvasScene::saveArchive()
+{
+    if (m_title->save(*m_texts, m_currentPixmapItem))
+        m_contentsChanged = false;
+}
+
+void CanvasScene::saveArchiveFlag()
+{
+    m_title->setPicturesNeeded();
+}
+
+void CanvasScene::slotSaveArchive(GraphicsText* item)
+{
+    saveArchive();
+    saveArchiveFlag();
+    if (item)
+        item->update();
+}
+
+void CanvasScene::slotMakeSceneThumnail()
+{
+    m_title->makeNeededPictures();
+}
+
+void CanvasScene::createThumnailPicture()
+{
+    m_title->makeSmallPicture();
+}
+
+bool CanvasScene::isEditFinish() const
+{
+    return m_title->isEditFinish();
+}
+
+bool CanvasScene::waitForPictures() const
+{
+    return m_title->waitForPictures();
+}
+
+void CanvasScene::generateThumbnail(QSize size, const QString& path)
+{
+    QPixmap picture(size);
+    if (picture.isNull())
+        return;
+    picture.fill(Qt::transparent);
+    QPainter painter(&picture);
+    painter.setRenderHint(QPainter::Antialiasing);
+    render(&painter);
+    painter.end();
+    PngWriter::save(picture.toImage(), path);
+}
+
+void CanvasScene::folderRenamed(const QString& before, const QString& after)
+{
+    if (!m_title->folderRenamed(before, after) || !itemIsEditorInteraction())
+        return;
+    leaveEditing();
+    slotDeleteEmptyItems();
+    disableTextPropertyArea();
+}
+
 // Background and safe area
 
 void CanvasScene::slotShowCanvasBG(QAction* action)
@@ -700,31 +606,29 @@ void CanvasScene::setModuleInfo(SystemSetupDef::emInformationModel model)
 {
     const bool china = model == SystemSetupDef::emInformationModelChina;
     m_module = china ? 1 : 0;
-    m_cnFamilyFlag = china;
-    GraphicsText::IS_CN_MODULE = china;
+    m_newTextStyle->setFamilyOfModel(china ? FAMILY_FOR_CN_MODULE : QString());
+    InputLanguageFonts::IS_CN_MODULE = china;
     resetLastFontInfo();
 }
 
 void CanvasScene::resetLastFontInfo()
 {
     if (m_module == 1)
-        GraphicsText::fillLastFonts(FAMILY_FOR_CN_MODULE);
+        InputLanguageFonts::fillLastFonts(FAMILY_FOR_CN_MODULE);
     else
-        GraphicsText::resetLastFonts();
+        InputLanguageFonts::resetLastFonts();
 }
 
 void CanvasScene::slotSceneInputLanguageChanged(SystemSetupDef::emInputLanguageType language)
 {
-    const int row = GraphicsText::languageRow(language);
-    m_languageChanged = m_languageChanged || row != m_languageRow;
-    m_languageRow = row;
+    m_newTextStyle->setLanguageRow(InputLanguageFonts::languageRow(language));
     resetLastFontInfo();
 }
 
 void CanvasScene::slotSetItemInputlanguage(GraphicsText* item)
 {
     if (item)
-        item->setInputLanguage(m_languageRow);
+        item->setInputLanguage(m_newTextStyle->languageRow());
 }
 
 void CanvasScene::slotShowMessageWhenUsingDefaultFont(QString family)
@@ -737,43 +641,14 @@ void CanvasScene::slotShowMessageWhenUsingDefaultFont(QString family)
 
 void CanvasScene::slotSendCustomEvent(GraphicsText* item)
 {
-    m_itemForKeyboard = item;
+    m_keyboard->setItem(item);
     QCoreApplication::sendEvent(this, &mRegisterEvent);
 }
 
 void CanvasScene::customEvent(QEvent* event)
 {
-    if (event->type() != mRegisterEvent.type())
-        return;
-    if (m_itemForKeyboard) {
-        openKeyboardForItem(m_itemForKeyboard);
-    } else if (KSInputContext* context = KSInputContext::instance()) {
-        context->dummyCloseSoftKeyBoardWindow();
-    }
-}
-
-void CanvasScene::openKeyboardForItem(GraphicsText* item)
-{
-    KSInputContext* context = KSInputContext::instance();
-    QWidget* view = views().isEmpty() ? nullptr : views().first();
-    if (context && view)
-        context->setFocusWidget(view);
-    QString data;
-    if (item->isDoubleClickedSelection()) {
-        data = getDoubleClickDataInfo(QString());
-    } else if (m_newTextFlag == 0) {
-        data = getCommonStateDataInfo(QString(), item);
-    } else {
-        KSInputContext::resetFocusWidget();
-        data = getNewTextDataInfo(QString());
-        m_newTextFlag = 0;
-    }
-    item->setObjectName(data);
-    if (!context || !view)
-        return;
-    context->setFocusWidget(view);
-    const QEvent request(QEvent::RequestSoftwareInputPanel);
-    context->filterEvent(&request);
+    if (event->type() == mRegisterEvent.type())
+        m_keyboard->request(views().isEmpty() ? nullptr : views().first(), tr("Text Input"));
 }
 
 QString CanvasScene::getDataInfo(const SubCommonDefine::tagSoftKeyBoardInitData& data) const

@@ -11,14 +11,15 @@
 #include <memory>
 
 class Archive;
-class CanvasController;
-class FontStyle;
 class GraphicsPixmap;
 class NewTextStyle;
 class QAction;
 class QUndoCommand;
 class SafeAreaLines;
+class SceneKeyboard;
+class ShownTitle;
 class TextObjectList;
+class TextPairMaker;
 
 namespace SubCommonDefine
 {
@@ -55,14 +56,14 @@ public:
 
     void saveArchive();
     // Marks that the pictures of the title are out of date.
-    void saveArchiveFlag() { m_thumbnailNeeded = true; }
+    void saveArchiveFlag();
     void createThumnailPicture();
     bool isEditFinish() const;
     // Blocks until the pictures are written, or nothing has come of them for a long time: the disk hangs, and
     // they are written when it goes on. Returns isEditFinish().
     bool waitForPictures() const;
-    // The operator goes away from the title shown: what is being edited is taken over, blank objects go, and
-    // the pictures are made.
+    // Call before the operator leaves the title shown: what is being edited is taken over, blank objects are
+    // deleted, and the pictures are made.
     void leaveTitle();
     // Shows no title. Nothing is saved.
     void clearCanvas();
@@ -96,7 +97,6 @@ public:
 
     static GraphicsText* getParentItem(GraphicsText* item) { return item ? item->parentTextItem() : nullptr; }
     bool isTheSame(TText* style) const;
-    static int getItemTextEditId(int status, bool overall, bool same);
     QString getDataInfo(const SubCommonDefine::tagSoftKeyBoardInitData& data) const;
     QString getNewTextDataInfo(const QString& text) const;
     QString getDoubleClickDataInfo(const QString& text) const;
@@ -175,44 +175,27 @@ private:
     void leaveEditing();
     bool archiveIsNull(const Archive* archive);
     void reportMissingFamily();
-    GraphicsText* buildPair(TText* record);
+    void addText(GraphicsText* item);
     void pushCommand(QUndoCommand* command);
     void addCGraphicsPixmapItem(const QString& path, QPointF position, double z);
-    int initItemLastAlphaStyleWithLastTextStyle(TText& record);
-    QPointF getInitItemScenePosition();
-    void changeItemTextStyleAccordingToItemStatus(GraphicsText* item, TText* style, int id, int mode,
-                                                  bool overall, int undoFlag);
     void takeBackPreviews(const GraphicsText* except = nullptr);
     void pushDeleteCommand(GraphicsText* item);
-    bool saveArchiveXML(const QString& path);
-    // Whether a picture of the title is missing or older than its file.
-    bool lacksPictures() const;
-    void openKeyboardForItem(GraphicsText* item);
 
     QPointer<GraphicsText> m_currentItem;
     // Owned by the scene's item tree.
     GraphicsPixmap* m_currentPixmapItem = nullptr;
-    std::unique_ptr<Archive> m_archive;
-    std::unique_ptr<CanvasController> m_controller;
-    std::unique_ptr<FontStyle> m_defaultFontStyle;
+    std::unique_ptr<ShownTitle> m_title;
     std::unique_ptr<NewTextStyle> m_newTextStyle;
+    std::unique_ptr<TextPairMaker> m_pairs;
+    std::unique_ptr<SceneKeyboard> m_keyboard;
     bool m_contentsChanged = false;
-    QPointer<GraphicsText> m_itemForKeyboard;
     int m_currentEditItemId = -1;
     int m_currentPressedObjectId = -1;
-    std::unique_ptr<IThumbnailRender> m_thumbnailRender;
     bool m_drawSafeArea = false;
     std::unique_ptr<TextObjectList> m_texts;
     std::unique_ptr<SafeAreaLines> m_safeArea;
-    int m_newTextFlag = 0;
     bool m_defaultFontUsed = false;
     QString m_missingFamily;
-    bool m_cnFamilyFlag = false;
-    QPointer<GraphicsText> m_currentParentItem;
-    int m_languageRow = 4;
-    bool m_languageChanged = false;
-    bool m_panelTold = false; // of what it shows, for the object that is being made
     int m_topZ = 0;
-    bool m_thumbnailNeeded = false;
     int m_module = 0;
 };

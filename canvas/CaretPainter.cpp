@@ -1,9 +1,10 @@
 #include "canvas/CaretPainter.h"
 
+#include "canvas/CaretGeometry.h"
 #include "canvas/CharacterFormat.h"
-#include "canvas/GraphicsText.h"
+#include "canvas/ITextSurface.h"
 #include "canvas/StyleDocument.h"
-#include "canvas/TextPainter.h"
+#include "canvas/TextObjectConstants.h"
 
 #include <QFontMetricsF>
 #include <QPainter>
@@ -13,6 +14,8 @@
 #include <QTextDocument>
 #include <QTextLayout>
 #include <algorithm>
+
+using namespace TextObjectConstants;
 
 namespace
 {
@@ -26,41 +29,41 @@ constexpr double CaretOverhang = 3.0;
 
 const QPixmap& unpressedPicture()
 {
-    static const QPixmap picture(TextObjectConstants::UN_PRESSED_CARET_PIXMAP_PATH);
+    static const QPixmap picture(UN_PRESSED_CARET_PIXMAP_PATH);
     return picture;
 }
 
 const QPixmap& pressedPicture()
 {
-    static const QPixmap picture(TextObjectConstants::PRESSED_CARET_PIXMAP_PATH);
+    static const QPixmap picture(PRESSED_CARET_PIXMAP_PATH);
     return picture;
 }
 
 } // namespace
 
-CaretPainter::CaretPainter(GraphicsText& item, TouchState& state) : m_item(item), m_state(state)
+CaretPainter::CaretPainter(const TextObjectParts& parts, TouchState& state) : m_parts(parts), m_state(state)
 {
 }
 
 bool CaretPainter::noHandleCursor() const
 {
-    if (m_state.handleMoving)
+    if (m_state.isHandleHeld())
         return false;
     if (!m_state.handleCaret)
         return true;
-    return !m_item.textCursor().hasSelection() && m_state.previous.position < 0;
+    return !m_parts.surface.selection().hasSelection() && m_state.previous.position < 0;
 }
 
 void CaretPainter::refreshHandles()
 {
     if (!m_state.handleCaret)
         return;
-    const QTextCursor cursor = m_item.textCursor();
+    const QTextCursor cursor = m_parts.surface.selection();
     if (cursor.hasSelection()) {
         m_state.previous.position = cursor.anchor();
         m_state.current.position = cursor.position();
     }
-    CaretGeometry& carets = m_item.textPainter().carets();
+    CaretGeometry& carets = m_parts.carets;
     TouchState::End& current = m_state.current;
     carets.caretPoint(current.line, current.point, current.block, cursor.position());
     if (!cursor.hasSelection()) {
@@ -75,20 +78,21 @@ void CaretPainter::refreshHandles()
 
 void CaretPainter::adjustCurPosToPaintSelectionWhenContinueSelect()
 {
-    QTextCursor cursor = m_item.textCursor();
-    if (!m_state.handleMoving || cursor.hasSelection())
+    QTextCursor cursor = m_parts.surface.selection();
+    if (!m_state.isHandleHeld() || cursor.hasSelection())
         return;
     if (cursor.position() == m_state.previous.position || cursor.position() == m_state.current.position)
         return;
-    if (m_state.current.position < 0 || m_state.current.position >= m_item.document()->characterCount())
+    if (m_state.current.position < 0 || m_state.current.position >= m_parts.document.characterCount())
         return;
     cursor.setPosition(m_state.current.position);
-    m_item.setTextCursor(cursor);
+    m_parts.surface.select(cursor);
 }
 
 void CaretPainter::paintSelectionWhenContinueSelect(QPainter* painter) const
 {
-    if (!m_state.handleMoving || m_item.textCursor().hasSelection() || m_state.previous.position < 0)
+    if (!m_state.isHandleHeld() || m_parts.surface.selection().hasSelection() ||
+        m_state.previous.position < 0)
         return;
     if (m_state.previous.block != m_state.current.block) {
         paintShadowBlockFromPreviousCaretToCurrentCaret(painter);
@@ -103,9 +107,9 @@ void CaretPainter::paintShadowBlockFromPreviousCaretToCurrentCaret(QPainter* pai
     const bool forward = m_state.previous.block < m_state.current.block;
     const TouchState::End& first = forward ? m_state.previous : m_state.current;
     const TouchState::End& last = forward ? m_state.current : m_state.previous;
-    CaretGeometry& carets = m_item.textPainter().carets();
+    CaretGeometry& carets = m_parts.carets;
     for (int number = first.block; number <= last.block; ++number) {
-        const QTextBlock block = m_item.document()->findBlockByNumber(number);
+        const QTextBlock block = m_parts.document.findBlockByNumber(number);
         if (!block.isValid())
             continue;
         TouchState::End begin;
@@ -123,7 +127,7 @@ void CaretPainter::paintCaretAndHandles(QPainter* painter)
 {
     adjustCurPosToPaintSelectionWhenContinueSelect();
     painter->setBrush(Qt::NoBrush);
-    if (m_state.handleMoving) {
+    if (m_state.isHandleHeld()) {
         paintCursor(painter);
         paintMovingHandles(painter);
     } else if (m_state.handleCaret) {
@@ -135,15 +139,16 @@ void CaretPainter::paintCaretAndHandles(QPainter* painter)
 
 void CaretPainter::paintCursor(QPainter* painter) const
 {
-    const int position = m_item.textCursor().position();
-    const StyleDocument& styles = m_item.styles();
+    const int position = m_parts.surface.selection().position();
+    const StyleDocument& styles = m_parts.styles;
     if (position < 0 || position > styles.count())
         return;
     TouchState::End caret;
-    if (!m_item.textPainter().carets().caretPoint(caret.line, caret.point, caret.block, position))
+    if (!m_parts.carets.caretPoint(caret.line, caret.point, caret.block, position))
         return;
     const TextStyle* style = styles.at(std::max(position - 1, 0));
-    const QFont font = style ? CharacterFormat::font(*style, m_item.canvasRatio()) : m_item.font();
+    const QFont font =
+        style ? CharacterFormat::font(*style, m_parts.surface.canvasRatio()) : m_parts.document.defaultFont();
     const double length = caret.line.length();
     const double top = caret.line.y1();
     const double ascentTop = top + BaselineShare * length - QFontMetricsF(font).height() - CaretOverhang;
@@ -172,7 +177,7 @@ void CaretPainter::showCursorForSelecting(QPainter* painter)
     refreshHandles();
     painter->setPen(QPen(CaretColor, HandleLineWidth));
     drawCurPosPixmap(painter);
-    if (!m_item.textCursor().hasSelection())
+    if (!m_parts.surface.selection().hasSelection())
         return;
     painter->drawLine(m_state.previous.line);
     drawHandle(painter, m_state.previous, unpressedPicture());
@@ -182,13 +187,19 @@ void CaretPainter::drawCurPosPixmap(QPainter* painter) const
 {
     if (m_state.previous.position < 0)
         return;
-    if (m_state.released) {
+    switch (m_state.gesture) {
+    case TouchState::Gesture::None:
         painter->drawLine(m_state.current.line);
         drawHandle(painter, m_state.current, unpressedPicture());
-    } else if (m_state.moved || m_state.longPressed) {
+        break;
+    case TouchState::Gesture::Press:
+    case TouchState::Gesture::DoubleTap:
+        if (m_parts.surface.selection().position() == m_state.current.position)
+            drawHandle(painter, m_state.current, pressedPicture());
+        break;
+    default:
         painter->drawLine(m_state.current.line);
         drawHandle(painter, m_state.current, pressedPicture());
-    } else if (m_state.pressed && m_item.textCursor().position() == m_state.current.position) {
-        drawHandle(painter, m_state.current, pressedPicture());
+        break;
     }
 }

@@ -1,18 +1,17 @@
 #pragma once
 
-#include "canvas/TextObjectConstants.h"
+#include "canvas/TextObjectParts.h"
 #include "canvas/TouchState.h"
 
-class GraphicsText;
 class QPainter;
 class QPixmap;
-class QTextBlock;
 
 // Paints caret and selection handles of a text object that is edited. GUI thread only.
-class CaretPainter : public TextObjectConstants
+class CaretPainter
 {
 public:
-    CaretPainter(GraphicsText& item, TouchState& state);
+    // The state outlives this object.
+    CaretPainter(const TextObjectParts& parts, TouchState& state);
 
     // Below the glyphs: the selection while a handle is dragged.
     void paintSelectionWhenContinueSelect(QPainter* painter) const;
@@ -21,7 +20,7 @@ public:
 
     // Brings both ends to where the cursor stands now.
     void refreshHandles();
-    // No handle is shown: the selection cannot be dragged.
+    // Returns whether no handle is shown, so that the selection cannot be dragged.
     bool noHandleCursor() const;
 
 private:
@@ -33,6 +32,6 @@ private:
     static void drawHandle(QPainter* painter, const TouchState::End& end, const QPixmap& picture);
     void paintShadowBlockFromPreviousCaretToCurrentCaret(QPainter* painter) const;
 
-    GraphicsText& m_item;
+    TextObjectParts m_parts;
     TouchState& m_state;
 };

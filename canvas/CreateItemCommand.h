@@ -1,30 +1,25 @@
 #pragma once
 
-#include "canvas/CommandTitle.h"
+#include "canvas/CanvasCommand.h"
 #include "document/TText.h"
 
-#include <QUndoCommand>
 #include <memory>
 
-class CanvasScene;
-
-// Makes a new text object; made by the scene, owned by the undo stack. Undo hides the object, redo builds it
+// Makes a new text object; Undo hides the object, redo builds it
 // anew.
-class CreateItemCommand : public QUndoCommand
+class CreateItemCommand : public CanvasCommand
 {
 public:
     // Makes the object at once, so that it exists before the command is pushed.
     explicit CreateItemCommand(CanvasScene* scene, QUndoCommand* parent = nullptr);
 
-    void undo() override;
-    void redo() override;
-
     // -1 when no object could be made.
     int objectId() const { return m_objectId; }
 
 private:
-    CanvasScene* m_scene;
-    CommandTitle m_title;
+    void undoChange() override;
+    void redoChange() override;
+
     // Null until the first undo and after each redo.
     std::unique_ptr<TText> m_record;
     TText m_lastAlpha;

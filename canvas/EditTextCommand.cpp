@@ -8,9 +8,7 @@ bool EditTextCommand::mRedoButtonClickedFlag = false;
 
 EditTextCommand::EditTextCommand(TText* oldText, TText* newText, TText* oldLast, TText* newLast,
                                  CanvasScene* scene, QUndoCommand* parent)
-    : QUndoCommand(parent)
-    , m_scene(scene)
-    , m_title(*scene)
+    : CanvasCommand(scene, parent)
     , m_oldText(*oldText)
     , m_newText(*newText)
     , m_oldLast(*oldLast)
@@ -21,7 +19,7 @@ EditTextCommand::EditTextCommand(TText* oldText, TText* newText, TText* oldLast,
 
 void EditTextCommand::showState(TText& text, TText& lastAlpha)
 {
-    GraphicsText* item = m_title.isShown() ? m_scene->findTextItem(text.getTextObjectID()) : nullptr;
+    GraphicsText* item = shownItem(text.getTextObjectID());
     if (!item)
         return;
     item->setLastAlpaTextStyleValue(lastAlpha);
@@ -29,22 +27,16 @@ void EditTextCommand::showState(TText& text, TText& lastAlpha)
     item->changeItemToSolidLineState();
 }
 
-void EditTextCommand::undo()
+void EditTextCommand::undoChange()
 {
-    m_scene->saveArchiveFlag();
     showState(m_oldText, m_oldLast);
-    m_scene->update();
-    m_scene->saveArchive();
     setText(QCoreApplication::translate("EditTextCommand", "edit undo"));
 }
 
-void EditTextCommand::redo()
+void EditTextCommand::redoChange()
 {
-    m_scene->saveArchiveFlag();
     if (mRedoButtonClickedFlag)
         showState(m_newText, m_newLast);
-    m_scene->update();
-    m_scene->saveArchive();
-    setText(QCoreApplication::translate("EditTextCommand", "edit redo"));
     mRedoButtonClickedFlag = true;
+    setText(QCoreApplication::translate("EditTextCommand", "edit redo"));
 }

@@ -2,6 +2,7 @@
 
 #include <QCache>
 #include <QChar>
+#include <QGuiApplication>
 #include <QHash>
 #include <QPainterPathStroker>
 #include <QRawFont>
@@ -38,10 +39,39 @@ bool mayBePicture(const QString& text)
     });
 }
 
+// What was found out about fonts and their characters. A font that was imported may bring a missing family.
+struct GlyphStore {
+    using Entry = std::shared_ptr<const GlyphPath>;
+
+    QHash<QString, bool> pictureFonts; // by family
+    QCache<GlyphKey, Entry> glyphs{CacheBytes};
+
+    void clear()
+    {
+        pictureFonts.clear();
+        glyphs.clear();
+    }
+};
+
+GlyphStore& store()
+{
+    static GlyphStore glyphStore;
+    static bool connected = false;
+    if (!connected && qGuiApp) {
+        connected = true;
+        QObject::connect(qGuiApp, &QGuiApplication::fontDatabaseChanged, qGuiApp, [] { glyphStore.clear(); });
+        QObject::connect(qGuiApp, &QObject::destroyed, [] {
+            glyphStore.clear();
+            connected = false;
+        });
+    }
+    return glyphStore;
+}
+
 // Fonts of coloured pictures have no outlines worth drawing.
 bool isPictureFont(const QRawFont& font)
 {
-    static QHash<QString, bool> known;
+    auto& known = store().pictureFonts;
     auto found = known.constFind(font.familyName());
     if (found == known.constEnd()) {
         const bool pictures = !font.fontTable("CBLC").isEmpty() || !font.fontTable("sbix").isEmpty() ||
@@ -139,13 +169,12 @@ int GlyphPath::cost() const
 
 std::shared_ptr<const GlyphPath> GlyphPathCache::glyph(const QFont& font, const QString& text)
 {
-    using Entry = std::shared_ptr<const GlyphPath>;
-    static QCache<GlyphKey, Entry> cache(CacheBytes);
+    auto& cache = store().glyphs;
     const GlyphKey key{font.family(), text,          font.pixelSize(),
                        font.weight(), font.italic(), text.size() > 1 ? font.letterSpacing() : 0.0};
-    if (const Entry* known = cache.object(key))
+    if (const GlyphStore::Entry* known = cache.object(key))
         return *known;
     auto made = std::make_shared<const GlyphPath>(font, text);
-    cache.insert(key, new Entry(made), made->cost());
+    cache.insert(key, new GlyphStore::Entry(made), made->cost());
     return made;
 }

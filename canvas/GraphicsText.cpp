@@ -1,7 +1,9 @@
 #include "canvas/GraphicsText.h"
 
 #include "canvas/IInputLanguageSource.h"
+#include "canvas/InputLanguageFonts.h"
 #include "canvas/StyleDocument.h"
+#include "canvas/TextObjectParts.h"
 #include "canvas/TextPainter.h"
 #include "canvas/TextShadowEffect.h"
 #include "canvas/TextStyleEditor.h"
@@ -25,6 +27,8 @@
 #include <QTextOption>
 #include <algorithm>
 
+using namespace TextObjectConstants;
+
 namespace
 {
 
@@ -45,7 +49,7 @@ bool isBlinkOfCaret(QObject* watched, const QEvent* event)
 } // namespace
 
 GraphicsText::GraphicsText(TText* record, int id, QGraphicsItem* parent, QGraphicsScene* scene)
-    : QGraphicsTextItem(parent), m_styles(std::make_unique<StyleDocument>())
+    : QGraphicsTextItem(parent), m_styles(std::make_unique<StyleDocument>()), m_placement(*this)
 {
     if (record)
         m_styles->setCurrent(*record);
@@ -57,7 +61,10 @@ GraphicsText::GraphicsText(TText* record, int id, QGraphicsItem* parent, QGraphi
 }
 
 GraphicsText::GraphicsText(bool parentObject, QGraphicsItem* parent, QGraphicsScene* scene)
-    : QGraphicsTextItem(parent), m_styles(std::make_unique<StyleDocument>()), m_parentObject(parentObject)
+    : QGraphicsTextItem(parent)
+    , m_styles(std::make_unique<StyleDocument>())
+    , m_placement(*this)
+    , m_parentObject(parentObject)
 {
     initDataForGraphicsText();
     if (scene)
@@ -68,9 +75,7 @@ GraphicsText::~GraphicsText() = default;
 
 void GraphicsText::initDataForGraphicsText()
 {
-    m_painter = std::make_unique<TextPainter>(*this);
-    m_styleEditor = std::make_unique<TextStyleEditor>(*this);
-    m_touchEditor = std::make_unique<TouchTextEditor>(*this);
+    makeUnits();
 
     setFlag(ItemIsMovable);
     setFlag(ItemIsSelectable);
@@ -103,6 +108,16 @@ void GraphicsText::initDataForGraphicsText()
     }
 }
 
+void GraphicsText::makeUnits()
+{
+    m_painter = std::make_unique<TextPainter>(*document(), *m_styles);
+    const TextObjectParts parts{*document(), *m_styles, m_painter->carets(), m_placement, *this, *this};
+    m_styleEditor = std::make_unique<TextStyleEditor>(parts);
+    m_touchEditor = std::make_unique<TouchTextEditor>(parts, *m_styleEditor);
+    connect(&m_styleEditor->undoTimer(), &QTimer::timeout, this, &GraphicsText::slotUndoTimeOut);
+    connect(&m_touchEditor->longPressTimer(), &QTimer::timeout, this, &GraphicsText::slotLongPressed);
+}
+
 // The pair
 
 GraphicsText* GraphicsText::parentTextItem() const
@@ -119,12 +134,6 @@ GraphicsText* GraphicsText::childTextItem() const
             return static_cast<GraphicsText*>(child);
     }
     return nullptr;
-}
-
-QGraphicsItem* GraphicsText::placedItem()
-{
-    GraphicsText* parent = parentTextItem();
-    return parent ? parent : this;
 }
 
 bool GraphicsText::isParentItem() const
@@ -146,6 +155,11 @@ void GraphicsText::parentFollows()
     parent->m_focusFlag = m_focusFlag;
     if (parent->textInteractionFlags() != textInteractionFlags())
         parent->setTextInteractionFlags(textInteractionFlags());
+    QTextDocument& frame = *parent->document();
+    if (frame.defaultTextOption().alignment() != document()->defaultTextOption().alignment())
+        frame.setDefaultTextOption(document()->defaultTextOption());
+    if (frame.textWidth() != textWidth())
+        frame.setTextWidth(textWidth());
     parent->update();
 }
 
@@ -154,6 +168,14 @@ void GraphicsText::update(const QRectF& rect)
     QGraphicsTextItem::update(rect);
     if (QGraphicsItem* parent = parentItem())
         parent->update();
+}
+
+void GraphicsText::placeAt(QPointF position)
+{
+    m_styles->current().setXValue(float(position.x()));
+    m_styles->current().setYValue(float(position.y()));
+    m_placement.placePair(position);
+    m_styles->refreshUndoBaseline();
 }
 
 // Records and styles
@@ -266,8 +288,8 @@ void GraphicsText::cancelPreview()
 
 void GraphicsText::setInputLanguage(int row)
 {
-    if (row >= 0 && row < LANGUAGE_ROWS)
-        mInputLanguage = row;
+    if (row >= 0 && row < InputLanguageFonts::LANGUAGE_ROWS)
+        InputLanguageFonts::mInputLanguage = row;
 }
 
 void GraphicsText::setFontFamilyEnsureMode(int mode)
@@ -277,10 +299,24 @@ void GraphicsText::setFontFamilyEnsureMode(int mode)
 
 void GraphicsText::setRadio(double ratio, bool big)
 {
-    m_canvasRatio = ratio;
     m_bigScene = big;
     document()->setDocumentMargin(big ? BIG_DOCUMENT_MARGIN : DOCUMENT_MARGIN);
-    m_painter->invalidate();
+    m_painter->setRatio(ratio);
+}
+
+double GraphicsText::canvasRatio() const
+{
+    return m_painter->ratio();
+}
+
+CaretGeometry& GraphicsText::carets()
+{
+    return m_painter->carets();
+}
+
+quint64 GraphicsText::contentVersion() const
+{
+    return m_painter->contentVersion();
 }
 
 void GraphicsText::initNewTextSelectAll()
@@ -298,6 +334,16 @@ void GraphicsText::pushLastEditTextIntoStack()
     m_styleEditor->pushLastEditTextIntoStack();
 }
 
+bool GraphicsText::isTyping() const
+{
+    return m_styleEditor->isTyping();
+}
+
+void GraphicsText::discardBurst()
+{
+    m_styleEditor->discardBurst();
+}
+
 void GraphicsText::getSelectionInfo(int begin, int end, int current, int mode)
 {
     m_touchEditor->getSelectionInfo(begin, end, current, mode);
@@ -313,16 +359,135 @@ bool GraphicsText::isBlank() const
     return toPlainText().simplified().trimmed().isEmpty();
 }
 
+// What the units ask for
+
+void GraphicsText::setWritable(bool writable)
+{
+    setTextInteractionFlags(writable ? Qt::TextEditorInteraction : Qt::NoTextInteraction);
+}
+
+void GraphicsText::handleByTextItem(QEvent::Type type, QEvent& event)
+{
+    switch (type) {
+    case QEvent::GraphicsSceneMousePress:
+        QGraphicsTextItem::mousePressEvent(static_cast<QGraphicsSceneMouseEvent*>(&event));
+        break;
+    case QEvent::GraphicsSceneMouseMove:
+        QGraphicsTextItem::mouseMoveEvent(static_cast<QGraphicsSceneMouseEvent*>(&event));
+        break;
+    case QEvent::GraphicsSceneMouseRelease:
+        QGraphicsTextItem::mouseReleaseEvent(static_cast<QGraphicsSceneMouseEvent*>(&event));
+        break;
+    case QEvent::GraphicsSceneMouseDoubleClick:
+        QGraphicsTextItem::mouseDoubleClickEvent(static_cast<QGraphicsSceneMouseEvent*>(&event));
+        break;
+    case QEvent::KeyPress:
+        QGraphicsTextItem::keyPressEvent(static_cast<QKeyEvent*>(&event));
+        break;
+    default:
+        break;
+    }
+}
+
+void GraphicsText::layoutChanged()
+{
+    parentFollows();
+    m_painter->invalidate();
+    update();
+}
+
+void GraphicsText::showShadow(const TShadow& shadow)
+{
+    m_shadowEffect->setOffset(shadow.getShadowDirectionX() * canvasRatio(),
+                              shadow.getShadowDirectionY() * canvasRatio());
+    m_shadowEffect->setBlurRadius(shadow.getShadowBlurRadius());
+    m_shadowEffect->setEnabled(shadow.getShadowDirectionX() != 0 || shadow.getShadowDirectionY() != 0);
+}
+
+// What the units report
+
+void GraphicsText::contentsEdited(TText& before, TText& after, TText& lastBefore, TText& lastAfter)
+{
+    Q_EMIT signalObjectContentsEdited(&before, &after, &lastBefore, &lastAfter);
+}
+
+void GraphicsText::objectMoved(QPointF from, QPointF to)
+{
+    Q_EMIT signalObjectPositionChanged(getItemTText()->getTextObjectID(), from, to);
+}
+
+void GraphicsText::styleShown(TText& style)
+{
+    Q_EMIT signalNotifyPropertyAreaObjectSelectionStyleChange(&style);
+}
+
+void GraphicsText::selectionModeChanged(bool shadowAndAlign, bool move)
+{
+    Q_EMIT signalNotifyTextPropertyAreaObjectSelectionMode(shadowAndAlign, move);
+}
+
+void GraphicsText::objectSelected()
+{
+    Q_EMIT signalNotifyIfExistSelectedObject(true);
+}
+
+void GraphicsText::familyReplaced(const QString& family)
+{
+    Q_EMIT signalShowMessageWhenUsingDefaultFont(family);
+}
+
+void GraphicsText::textTyped()
+{
+    m_touchEditor->clearHandleCaret();
+}
+
+void GraphicsText::objectPressed()
+{
+    Q_EMIT signalNotifySceneCurrentMousePressedObjectId(getItemTText()->getTextObjectID());
+}
+
+void GraphicsText::editingBegins()
+{
+    Q_EMIT signalGetSceneInputLanguage(this);
+}
+
+void GraphicsText::keyboardWanted(bool wanted)
+{
+    Q_EMIT signalNotifySceneCurrentObjectInEditMode(wanted ? this : nullptr);
+}
+
+void GraphicsText::keyboardClosed()
+{
+    LOG_DEBUG_OPERATE(L"Edit Area", 200, L"*****SoftKeyBoardClosed event is received*****");
+    // No later step may come between what was typed and the end of it.
+    m_styleEditor->pushLastEditTextIntoStack();
+    if (!(m_styles->undoBaseline() == m_styles->current())) {
+        TText before = m_styles->undoBaseline();
+        TText last = m_styles->lastAlpha();
+        contentsEdited(before, m_styles->current(), last, m_styles->lastAlpha());
+        m_styles->refreshUndoBaseline();
+    }
+    Q_EMIT signalSoftWareClosedWhenEditObject();
+    Q_EMIT signalSaveArchive(this);
+    if (isBlank()) {
+        Q_EMIT signalNotifyIfExistSelectedObject(false);
+        Q_EMIT signalDeleteItem();
+    } else {
+        changeItemToSolidLineState();
+    }
+}
+
 // Slots
 
 void GraphicsText::slotObjectDocumentChange(int position, int removed, int added)
 {
+    m_painter->invalidate();
     m_styleEditor->documentChanged(position, removed, added);
 }
 
 void GraphicsText::slotObjectPositionChanged()
 {
-    m_touchEditor->markPositionChanged();
+    m_placement.markMoved();
 }
 
 void GraphicsText::slotUndoTimeOut()
@@ -332,12 +497,13 @@ void GraphicsText::slotUndoTimeOut()
 
 void GraphicsText::slotLongPressed()
 {
-    m_touchEditor->longPressed();
+    if (isEnabled())
+        m_touchEditor->longPressed();
 }
 
 void GraphicsText::slotObjectDisplayInputLanguage(SystemSetupDef::emInputLanguageType language)
 {
-    mInputLanguage = languageRow(language);
+    InputLanguageFonts::mInputLanguage = InputLanguageFonts::languageRow(language);
 }
 
 // Geometry and painting
@@ -376,10 +542,10 @@ void GraphicsText::paint(QPainter* painter, const QStyleOptionGraphicsItem*, QWi
     // base class has nothing to paint.
     painter->save();
     if (m_parentObject) {
-        m_painter->drawItemBoundingRect(painter);
+        paintFrame(painter);
     } else {
         m_touchEditor->paintBelowGlyphs(painter);
-        m_painter->drawSelection(painter);
+        m_painter->drawSelection(painter, textCursor(), hasFocus());
         m_painter->drawItemText(painter);
         if (getBoundingLineStatus() == FocusEdit)
             m_touchEditor->paintAboveGlyphs(painter);
@@ -387,12 +553,20 @@ void GraphicsText::paint(QPainter* painter, const QStyleOptionGraphicsItem*, QWi
     painter->restore();
 }
 
+void GraphicsText::paintFrame(QPainter* painter)
+{
+    const GraphicsText* child = childTextItem();
+    const int status = child ? child->getBoundingLineStatus() : FocusNone;
+    if (status == FocusObject || (status == FocusEdit && child->getFocusFlag() == FocusEdit))
+        m_painter->drawItemBoundingRect(painter, child->boundingRect(), status);
+}
+
 // Events
 
 void GraphicsText::mousePressEvent(QGraphicsSceneMouseEvent* event)
 {
     if (m_parentObject)
-        QGraphicsTextItem::mousePressEvent(event);
+        handleByTextItem(QEvent::GraphicsSceneMousePress, *event);
     else
         m_touchEditor->mousePress(event);
 }
@@ -400,7 +574,7 @@ void GraphicsText::mousePressEvent(QGraphicsSceneMouseEvent* event)
 void GraphicsText::mouseMoveEvent(QGraphicsSceneMouseEvent* event)
 {
     if (m_parentObject)
-        QGraphicsTextItem::mouseMoveEvent(event);
+        handleByTextItem(QEvent::GraphicsSceneMouseMove, *event);
     else
         m_touchEditor->mouseMove(event);
 }
@@ -408,7 +582,7 @@ void GraphicsText::mouseMoveEvent(QGraphicsSceneMouseEvent* event)
 void GraphicsText::mouseReleaseEvent(QGraphicsSceneMouseEvent* event)
 {
     if (m_parentObject)
-        QGraphicsTextItem::mouseReleaseEvent(event);
+        handleByTextItem(QEvent::GraphicsSceneMouseRelease, *event);
     else
         m_touchEditor->mouseRelease(event);
 }
@@ -422,7 +596,7 @@ void GraphicsText::cancelTouch()
 void GraphicsText::mouseDoubleClickEvent(QGraphicsSceneMouseEvent* event)
 {
     if (m_parentObject)
-        QGraphicsTextItem::mouseDoubleClickEvent(event);
+        handleByTextItem(QEvent::GraphicsSceneMouseDoubleClick, *event);
     else
         m_touchEditor->mouseDoubleClick(event);
 }
@@ -439,7 +613,7 @@ void GraphicsText::contextMenuEvent(QGraphicsSceneContextMenuEvent* event)
 void GraphicsText::keyPressEvent(QKeyEvent* event)
 {
     if (m_parentObject) {
-        QGraphicsTextItem::keyPressEvent(event);
+        handleByTextItem(QEvent::KeyPress, *event);
         return;
     }
     // Pasted text takes the style of the place it comes to, not the one it had elsewhere.
@@ -482,7 +656,7 @@ void GraphicsText::customEvent(QEvent* event)
         return;
     if (event->type() == QEvent::Type(KSInputContext::SoftKeyBoardCloseType)) {
         Q_EMIT signalEndPreview();
-        m_touchEditor->keyboardClosed();
+        keyboardClosed();
     } else if (event->type() == KSSoftKeyboardCursorSettingEvent::myType) {
         Q_EMIT signalEndPreview();
         const auto& setting = static_cast<KSSoftKeyboardCursorSettingEvent&>(*event);

@@ -1,7 +1,9 @@
 #pragma once
 
-#include "canvas/InputLanguageFonts.h"
+#include "canvas/ITextObjectListener.h"
+#include "canvas/ITextSurface.h"
 #include "canvas/TextObjectConstants.h"
+#include "canvas/TextPlacement.h"
 #include "messaging/services/SystemSetupDef.h"
 
 #include <QGraphicsTextItem>
@@ -9,6 +11,7 @@
 #include <QRectF>
 #include <memory>
 
+class CaretGeometry;
 class QGraphicsDropShadowEffect;
 class QKeyEvent;
 class StyleDocument;
@@ -29,7 +32,7 @@ class TText;
 // Coordinates: item coordinates are pixels of the raster that the object is laid out for; positions in
 // records are scene coordinates of the 1280 canvas, font sizes and outline widths are pixels of the 1920
 // raster. GUI thread only.
-class GraphicsText : public QGraphicsTextItem, public TextObjectConstants, public InputLanguageFonts
+class GraphicsText : public QGraphicsTextItem, private ITextSurface, private ITextObjectListener
 {
     Q_OBJECT
 public:
@@ -48,8 +51,8 @@ public:
     // The other half of the pair, or null.
     GraphicsText* parentTextItem() const;
     GraphicsText* childTextItem() const;
-    // The item whose position places the object: the parent of a pair, else this one.
-    QGraphicsItem* placedItem();
+    // Places the pair and its record; the next change of style starts from there. Scene coordinates.
+    void placeAt(QPointF position);
 
     // The live record, owned by the item.
     TText* getItemTText() const;
@@ -68,8 +71,8 @@ public:
     // 0 selected as an object, 1 has a selection, 2 caret without selection, -1 not active.
     int getStatusId() const;
     int getBoundingLineStatus() const;
-    int getFocusFlag() const { return m_focusFlag; }
-    void setFocusFlag(int flag);
+    int getFocusFlag() const override { return m_focusFlag; }
+    void setFocusFlag(int flag) override;
     bool isHandleCaret() const;
     bool isDoubleClickedSelection() const;
 
@@ -98,6 +101,10 @@ public:
     void initNewTextSelectAll();
     void changeItemToSolidLineState();
     void pushLastEditTextIntoStack();
+    // Whether there is typing that is not part of an undo step yet.
+    bool isTyping() const;
+    // Forgets typing that has not become a step: the object is about to be hidden.
+    void discardBurst();
     // Cursor of the soft keyboard: mode 0 places the cursor, 1 selects from begin to end, 2 selects all.
     void getSelectionInfo(int begin, int end, int current, int mode);
     void showCurrentTextStyle();
@@ -111,21 +118,15 @@ public:
     // Updates the frame with the item.
     void update(const QRectF& rect = QRectF());
 
-    // Units of this class; the children of the canvas reach the item's state through them.
-    StyleDocument& styles() { return *m_styles; }
-    const StyleDocument& styles() const { return *m_styles; }
-    TextStyleEditor& styleEditor() { return *m_styleEditor; }
-    TouchTextEditor& touchEditor() { return *m_touchEditor; }
-    TextPainter& textPainter() { return *m_painter; }
-    double canvasRatio() const { return m_canvasRatio; }
-    bool isBigScene() const { return m_bigScene; }
+    // Where the positions of the text stand, in item coordinates.
+    CaretGeometry& carets();
+    // Another number whenever what is drawn may have changed.
+    quint64 contentVersion() const;
+    double canvasRatio() const override;
     QGraphicsDropShadowEffect* shadowEffect() const { return m_shadowEffect; }
     // The rectangle of the layout, whatever the bounding rect flag.
     QRectF layoutRect() const { return QGraphicsTextItem::boundingRect(); }
-    // Call before the layout changes: the frame of the pair changes with it.
-    void announceGeometryChange();
-    // Copies focus flag and interaction flags to the parent and repaints it.
-    void parentFollows();
+    void parentFollows() override;
 
 public Q_SLOTS:
     void slotObjectDocumentChange(int position, int removed, int added);
@@ -174,19 +175,46 @@ protected:
     QVariant itemChange(GraphicsItemChange change, const QVariant& value) override;
 
 private:
-    friend class TouchTextEditor;
+    // ITextSurface
+    QTextCursor selection() const override { return textCursor(); }
+    void select(const QTextCursor& cursor) override { setTextCursor(cursor); }
+    bool isWritable() const override { return textInteractionFlags() == Qt::TextEditorInteraction; }
+    void setWritable(bool writable) override;
+    void takeFocus() override { setFocus(); }
+    void giveUpFocus() override { clearFocus(); }
+    void handleByTextItem(QEvent::Type type, QEvent& event) override;
+    void announceGeometryChange() override;
+    void layoutChanged() override;
+    void repaint() override { update(); }
+    void showShadow(const TShadow& shadow) override;
+
+    // ITextObjectListener
+    void contentsEdited(TText& before, TText& after, TText& lastBefore, TText& lastAfter) override;
+    void objectMoved(QPointF from, QPointF to) override;
+    void styleShown(TText& style) override;
+    void selectionModeChanged(bool shadowAndAlign, bool move) override;
+    void objectSelected() override;
+    void familyReplaced(const QString& family) override;
+    void textTyped() override;
+    void objectPressed() override;
+    void editingBegins() override;
+    void keyboardWanted(bool wanted) override;
 
     void initDataForGraphicsText();
+    void makeUnits();
+    // The keyboard was closed by the operator.
+    void keyboardClosed();
     QRectF limitedBoundingRect() const;
+    void paintFrame(QPainter* painter);
 
     std::unique_ptr<StyleDocument> m_styles;
     std::unique_ptr<TextPainter> m_painter;
+    TextPlacement m_placement;
     std::unique_ptr<TextStyleEditor> m_styleEditor;
     std::unique_ptr<TouchTextEditor> m_touchEditor;
     // Owned by the item through setGraphicsEffect.
     QGraphicsDropShadowEffect* m_shadowEffect = nullptr;
-    double m_canvasRatio = SCENEPERCENTAGE;
-    int m_focusFlag = FocusNone;
+    int m_focusFlag = TextObjectConstants::FocusNone;
     bool m_parentObject = false;
     bool m_bigScene = false;
     bool m_boundingRectFlag = false;

@@ -1,44 +1,27 @@
 #include "canvas/MoveItemCommand.h"
 
 #include "canvas/CanvasScene.h"
-#include "canvas/StyleDocument.h"
-#include "document/TText.h"
 
 MoveItemCommand::MoveItemCommand(CanvasScene* scene, int id, QPointF oldPosition, QPointF newPosition,
                                  QUndoCommand* parent)
-    : QUndoCommand(parent)
-    , m_scene(scene)
-    , m_title(*scene)
-    , m_oldPosition(oldPosition)
-    , m_newPosition(newPosition)
-    , m_objectId(id)
+    : CanvasCommand(scene, parent), m_oldPosition(oldPosition), m_newPosition(newPosition), m_objectId(id)
 {
 }
 
 void MoveItemCommand::moveTo(QPointF position)
 {
-    m_scene->saveArchiveFlag();
-    GraphicsText* item = m_title.isShown() ? m_scene->findTextItem(m_objectId) : nullptr;
-    if (item) {
-        item->getItemTText()->setXValue(float(position.x()));
-        item->getItemTText()->setYValue(float(position.y()));
-        if (GraphicsText* parent = item->parentTextItem())
-            parent->setPos(position);
-        item->setPos(0.0, 0.0);
-        // The next change of style starts from this place.
-        item->styles().refreshUndoBaseline();
+    if (GraphicsText* item = shownItem(m_objectId)) {
+        item->placeAt(position);
         item->changeItemToSolidLineState();
     }
-    m_scene->update();
-    m_scene->saveArchive();
 }
 
-void MoveItemCommand::undo()
+void MoveItemCommand::undoChange()
 {
     moveTo(m_oldPosition);
 }
 
-void MoveItemCommand::redo()
+void MoveItemCommand::redoChange()
 {
     moveTo(m_newPosition);
 }

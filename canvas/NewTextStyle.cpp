@@ -1,5 +1,7 @@
 #include "canvas/NewTextStyle.h"
 
+#include "canvas/InputLanguageFonts.h"
+#include "canvas/TextObjectConstants.h"
 #include "document/FontStyle.h"
 
 #include <memory>
@@ -39,9 +41,17 @@ void NewTextStyle::rememberChange(const TText& style)
     takeFirstCharacter(style);
 }
 
+void NewTextStyle::propertyChanged(int id)
+{
+    m_languageChanged = false;
+    if (id == TextObjectConstants::PropertyFamily)
+        m_familyOfModel.clear();
+}
+
 void NewTextStyle::rememberProperty(const TText& style)
 {
     m_property = style;
+    m_panelTold = true;
     if (!style.textItems().empty())
         takeFirstCharacter(style);
 }
@@ -53,10 +63,16 @@ void NewTextStyle::takeFirstCharacter(const TText& style)
     m_last.setTextItems({first.release()});
 }
 
-QString NewTextStyle::family() const
+QString NewTextStyle::rememberedFamily() const
 {
     return m_last.textItems().empty() ? QString()
                                       : QString::fromStdString(m_last.textItems().front()->getFontFamily());
+}
+
+void NewTextStyle::setLanguageRow(int row)
+{
+    m_languageChanged = m_languageChanged || row != m_languageRow;
+    m_languageRow = row;
 }
 
 void NewTextStyle::applyTo(TText& record) const
@@ -66,16 +82,32 @@ void NewTextStyle::applyTo(TText& record) const
     record.setTextAlign(m_property.getTextAlign());
 }
 
-TText NewTextStyle::firstCharacter(const QString& family) const
+NewTextStyle::FirstCharacter NewTextStyle::firstCharacter()
 {
+    const QString ofLanguage =
+        InputLanguageFonts::LAST_KEEPED_FONT[size_t(m_languageRow)][InputLanguageFonts::Asian];
+    FirstCharacter first;
+    QString family = rememberedFamily();
+    if (m_panelTold) {
+        // What the panel shows holds. It shows the family of a new language until a text is selected.
+        if (m_languageChanged && family == ofLanguage)
+            first.ensureMode = 1;
+    } else if (!m_familyOfModel.isEmpty()) {
+        family = m_familyOfModel;
+        first.ensureMode = 0;
+    } else if (m_languageChanged) {
+        family = ofLanguage;
+        first.ensureMode = 1;
+    }
+    m_languageChanged = false;
+
     auto style = std::make_unique<TextStyle>();
     if (!m_last.textItems().empty())
         *style = *m_last.textItems().front();
     style->setText(std::string());
     if (!family.isEmpty())
         style->setFontFamily(family.toStdString());
-    TText record;
-    applyTo(record);
-    record.setTextItems({style.release()});
-    return record;
+    applyTo(first.record);
+    first.record.setTextItems({style.release()});
+    return first;
 }

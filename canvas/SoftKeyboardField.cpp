@@ -1,9 +1,12 @@
 #include "canvas/SoftKeyboardField.h"
 
 #include "canvas/GraphicsText.h"
+#include "canvas/TextObjectConstants.h"
 
 #include <QStringList>
 #include <QTextCursor>
+
+using namespace TextObjectConstants;
 
 namespace
 {
@@ -19,13 +22,13 @@ SubCommonDefine::tagSoftKeyBoardInitData fieldData(const QString& title, const Q
     data.fieldKind = 0;
     data.title = title.toStdWString();
     data.keyboardType = keyboardType;
-    data.maxLength = GraphicsText::CHARACTER_LIMIT;
+    data.maxLength = CHARACTER_LIMIT;
     data.text = text.toStdWString();
     data.textLength = -1;
     data.selectionStart = -1;
     data.selectionEnd = -1;
     data.selectionMode = WholeTextSelected;
-    data.lastValue = GraphicsText::CHARACTER_LIMIT;
+    data.lastValue = CHARACTER_LIMIT;
     return data;
 }
 

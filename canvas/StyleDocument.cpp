@@ -1,10 +1,13 @@
 #include "canvas/StyleDocument.h"
 
 #include "canvas/InputLanguageFonts.h"
+#include "canvas/TextObjectConstants.h"
 
 #include <algorithm>
 #include <cmath>
 #include <utility>
+
+using namespace TextObjectConstants;
 
 namespace
 {

@@ -1,6 +1,5 @@
 #pragma once
 
-#include "canvas/TextObjectConstants.h"
 #include "document/TText.h"
 
 #include <QChar>
@@ -14,7 +13,7 @@
 //
 // A character of two units keeps its whole text in the first style and an empty string in the second, since
 // half of it has no UTF-8 form; so it survives styling, saving and loading.
-class StyleDocument : public TextObjectConstants
+class StyleDocument
 {
 public:
     StyleDocument();

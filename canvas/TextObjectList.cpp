@@ -1,13 +1,15 @@
 #include "canvas/TextObjectList.h"
 
 #include "canvas/GraphicsText.h"
-#include "canvas/TextStyleEditor.h"
+#include "canvas/TextObjectConstants.h"
 #include "document/TText.h"
 #include "touchui/KSInputContext.h"
 
 #include <QGraphicsScene>
 #include <QTextCursor>
 #include <algorithm>
+
+using namespace TextObjectConstants;
 
 TextObjectList::TextObjectList(const QGraphicsScene& scene) : m_scene(scene)
 {
@@ -73,9 +75,8 @@ double TextObjectList::maxZValue() const
 bool TextObjectList::isSelectionMode() const
 {
     const QList<GraphicsText*> texts = enabledTexts();
-    return std::any_of(texts.begin(), texts.end(), [](const GraphicsText* item) {
-        return item->getFocusFlag() == GraphicsText::FocusObject;
-    });
+    return std::any_of(texts.begin(), texts.end(),
+                       [](const GraphicsText* item) { return item->getFocusFlag() == FocusObject; });
 }
 
 bool TextObjectList::isEditorInteraction() const
@@ -106,7 +107,7 @@ void TextObjectList::release(GraphicsText* item)
         cursor.clearSelection();
         item->setTextCursor(cursor);
     }
-    item->setFocusFlag(GraphicsText::FocusNone);
+    item->setFocusFlag(FocusNone);
     item->setTextInteractionFlags(Qt::NoTextInteraction);
     item->parentFollows();
 }
@@ -126,7 +127,7 @@ void TextObjectList::clearSelectionMode()
 {
     const QList<GraphicsText*> texts = enabledTexts();
     for (GraphicsText* item : texts) {
-        item->setFocusFlag(GraphicsText::FocusNone);
+        item->setFocusFlag(FocusNone);
         item->parentFollows();
         restoreZ(item);
         item->update();
@@ -136,7 +137,7 @@ void TextObjectList::clearSelectionMode()
 void TextObjectList::hide(GraphicsText* item)
 {
     m_listed.removeAll(item);
-    item->styleEditor().discardBurst();
+    item->discardBurst();
     GraphicsText* parent = item->parentTextItem();
     if (!parent)
         return;

@@ -1,7 +1,6 @@
 #include "canvas/TextPainter.h"
 
 #include "canvas/CharacterFormat.h"
-#include "canvas/GraphicsText.h"
 #include "canvas/StyleDocument.h"
 
 #include <QAbstractTextDocumentLayout>
@@ -12,7 +11,10 @@
 #include <QTextBlock>
 #include <QTextBoundaryFinder>
 #include <QTextCursor>
+#include <QTextDocument>
 #include <algorithm>
+
+using namespace TextObjectConstants;
 
 namespace
 {
@@ -40,8 +42,15 @@ bool isSpace(const QString& text)
 }
 } // namespace
 
-TextPainter::TextPainter(GraphicsText& item) : m_item(item), m_carets(*item.document())
+TextPainter::TextPainter(const QTextDocument& document, const StyleDocument& styles)
+    : m_document(document), m_styles(styles), m_carets(document)
 {
+}
+
+void TextPainter::setRatio(double ratio)
+{
+    m_ratio = ratio;
+    invalidate();
 }
 
 void TextPainter::invalidate()
@@ -53,10 +62,10 @@ void TextPainter::invalidate()
 
 void TextPainter::addGlyph(int position, const QString& text, const CaretGeometry::Caret& caret)
 {
-    const TextStyle* style = m_item.styles().at(position);
+    const TextStyle* style = m_styles.at(position);
     if (!style || isSpace(text))
         return;
-    const QFont font = CharacterFormat::font(*style, m_item.canvasRatio());
+    const QFont font = CharacterFormat::font(*style, m_ratio);
     Glyph glyph;
     glyph.path = GlyphPathCache::glyph(font, text);
     glyph.baseline = QPointF(caret.x - CaretShift, caret.top + BaselineShare * caret.height);
@@ -65,7 +74,7 @@ void TextPainter::addGlyph(int position, const QString& text, const CaretGeometr
     glyph.edge = style->isTextEdge() != 0 && glyph.path->hasPath();
     if (glyph.edge) {
         glyph.edgeColor = CharacterFormat::color(style->textEdge().getEdgeColor());
-        glyph.edgeWidth = CharacterFormat::outlineWidth(*style, m_item.canvasRatio());
+        glyph.edgeWidth = CharacterFormat::outlineWidth(*style, m_ratio);
     }
     // No glyph of a usable font reaches farther than this from its baseline.
     const double extent = 2.0 * font.pixelSize() * double(text.size()) + glyph.edgeWidth;
@@ -126,7 +135,7 @@ void TextPainter::collectGlyphs()
     m_glyphs.clear();
     m_runs.clear();
     m_steps.clear();
-    for (QTextBlock block = m_item.document()->begin(); block.isValid(); block = block.next())
+    for (QTextBlock block = m_document.begin(); block.isValid(); block = block.next())
         collectBlock(block);
     m_runs.reserve(m_pending.size());
     for (const PendingRun& pending : m_pending) {
@@ -184,15 +193,9 @@ void TextPainter::drawItemText(QPainter* painter)
     painter->setRenderHint(QPainter::Antialiasing, antialiasing);
 }
 
-void TextPainter::drawItemBoundingRect(QPainter* painter)
+void TextPainter::drawItemBoundingRect(QPainter* painter, const QRectF& rect, int status)
 {
-    const GraphicsText* child = m_item.childTextItem();
-    if (!child)
-        return;
-    const int status = child->getBoundingLineStatus();
-    if (status == FocusNone || (status == FocusEdit && child->getFocusFlag() != FocusEdit))
-        return;
-    prepareFrame(child->boundingRect());
+    prepareFrame(rect);
     painter->setRenderHint(QPainter::Antialiasing, false);
     painter->fillRect(m_frame.rect, status == FocusObject ? SelectedFill : EditFill);
     painter->setRenderHint(QPainter::Antialiasing);
@@ -232,18 +235,17 @@ void TextPainter::prepareFrame(const QRectF& rect)
     }
 }
 
-void TextPainter::drawSelection(QPainter* painter)
+void TextPainter::drawSelection(QPainter* painter, const QTextCursor& cursor, bool hasFocus)
 {
-    const QTextCursor cursor = m_item.textCursor();
     if (!cursor.hasSelection())
         return;
     QAbstractTextDocumentLayout::PaintContext context;
     context.palette = QApplication::palette();
-    const auto group = m_item.hasFocus() ? QPalette::Active : QPalette::Inactive;
+    const auto group = hasFocus ? QPalette::Active : QPalette::Inactive;
     QAbstractTextDocumentLayout::Selection selection;
     selection.cursor = cursor;
     selection.format.setBackground(context.palette.brush(group, QPalette::Highlight));
     selection.format.setForeground(context.palette.brush(group, QPalette::HighlightedText));
     context.selections.append(selection);
-    m_item.document()->documentLayout()->draw(painter, context);
+    m_document.documentLayout()->draw(painter, context);
 }

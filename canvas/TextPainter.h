@@ -14,20 +14,26 @@
 #include <memory>
 #include <vector>
 
-class GraphicsText;
 class QPainter;
 class QTextBlock;
+class QTextCursor;
+class QTextDocument;
 class QTransform;
+class StyleDocument;
 
 // Paints one text object: outlines below glyphs, frames, selections. Keeps what it draws until the text, a
 // style or the layout changes. A character and the marks on it are drawn as one with the style of the
 // character, since a mark finds its base only in one font; each position keeps its own style in the record.
 // GUI thread only.
-class TextPainter : public TextObjectConstants
+class TextPainter
 {
 public:
-    explicit TextPainter(GraphicsText& item);
+    // Both outlive this object.
+    TextPainter(const QTextDocument& document, const StyleDocument& styles);
 
+    // Raster pixels per stored pixel.
+    void setRatio(double ratio);
+    double ratio() const { return m_ratio; }
     // Call when text, styles or layout changed.
     void invalidate();
     // Another number whenever what is drawn may have changed.
@@ -35,10 +41,10 @@ public:
     CaretGeometry& carets() { return m_carets; }
 
     void drawItemText(QPainter* painter);
-    // Frame of the pair; called for the parent.
-    void drawItemBoundingRect(QPainter* painter);
-    // Highlights the selection of the text cursor.
-    void drawSelection(QPainter* painter);
+    // Frame of a pair: status is that of the child, FocusEdit or FocusObject.
+    void drawItemBoundingRect(QPainter* painter, const QRectF& rect, int status);
+    // Highlights the selection of the cursor, with the colours of a text that has the focus or not.
+    void drawSelection(QPainter* painter, const QTextCursor& cursor, bool hasFocus);
 
 private:
     struct Glyph {
@@ -83,7 +89,9 @@ private:
     void addRuns(const Glyph& glyph, const QRectF& reach);
     void drawItemTextOutLine(QPainter* painter, const QTransform& origin, const QRectF& visible) const;
 
-    GraphicsText& m_item;
+    const QTextDocument& m_document;
+    const StyleDocument& m_styles;
+    double m_ratio = TextObjectConstants::SCENEPERCENTAGE;
     CaretGeometry m_carets;
     std::vector<Glyph> m_glyphs;
     std::vector<Run> m_runs;

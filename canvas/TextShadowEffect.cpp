@@ -1,7 +1,6 @@
 #include "canvas/TextShadowEffect.h"
 
 #include "canvas/GraphicsText.h"
-#include "canvas/TextPainter.h"
 
 #include <QPaintDevice>
 #include <QPainter>
@@ -48,9 +47,8 @@ void TextShadowEffect::draw(QPainter* painter)
     }
     const QTransform transform = painter->worldTransform();
     const QPoint place(int(std::floor(transform.dx())), int(std::floor(transform.dy())));
-    const Key key{m_item.textPainter().contentVersion(),
-                  transform * QTransform::fromTranslate(-place.x(), -place.y()), offset(), blurRadius(),
-                  color()};
+    const Key key{m_item.contentVersion(), transform * QTransform::fromTranslate(-place.x(), -place.y()),
+                  offset(), blurRadius(), color()};
     if (m_picture.isNull() || !(key == m_key)) {
         drawPicture(*painter, area);
         m_key = key;

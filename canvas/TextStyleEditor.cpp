@@ -1,28 +1,22 @@
 #include "canvas/TextStyleEditor.h"
 
 #include "canvas/CharacterFormat.h"
-#include "canvas/GraphicsText.h"
+#include "canvas/ITextObjectListener.h"
+#include "canvas/ITextSurface.h"
+#include "canvas/InputLanguageFonts.h"
 #include "canvas/StyleDocument.h"
-#include "canvas/TextPainter.h"
-#include "canvas/TouchTextEditor.h"
+#include "canvas/TextObjectConstants.h"
+#include "canvas/TextPlacement.h"
 
-#include <QGraphicsDropShadowEffect>
 #include <QTextBlock>
+#include <QTextCursor>
 #include <QTextDocument>
-#include <QTextLayout>
-#include <QTextOption>
 #include <algorithm>
-#include <cmath>
+
+using namespace TextObjectConstants;
 
 namespace
 {
-
-// Styles that the document lays out alike.
-bool sameLayout(const TextStyle& a, const TextStyle& b)
-{
-    return a.fontIsTheSame(b) && a.getTextKerning() == b.getTextKerning() &&
-           (a.isTextEdge() != 0) == (b.isTextEdge() != 0);
-}
 
 int documentLength(const QTextDocument& document)
 {
@@ -44,11 +38,16 @@ private:
     TextStyleEditor& m_editor;
 };
 
-TextStyleEditor::TextStyleEditor(GraphicsText& item) : m_item(item), m_styles(item.styles())
+TextStyleEditor::TextStyleEditor(const TextObjectParts& parts)
+    : m_document(parts.document)
+    , m_styles(parts.styles)
+    , m_placement(parts.placement)
+    , m_surface(parts.surface)
+    , m_listener(parts.listener)
+    , m_layout(parts)
 {
     m_undoTimer.setSingleShot(true);
     m_undoTimer.setInterval(EDIT_AUTO_SAVE_TIME);
-    QObject::connect(&m_undoTimer, &QTimer::timeout, &item, &GraphicsText::slotUndoTimeOut);
 }
 
 // Loading
@@ -59,44 +58,19 @@ void TextStyleEditor::ensureFamily(TextStyle& style)
     if (CharacterFormat::familyIsInstalled(wanted))
         return;
     style.setFontFamily(InputLanguageFonts::substituteFamily().toStdString());
-    Q_EMIT m_item.signalShowMessageWhenUsingDefaultFont(wanted);
-}
-
-void TextStyleEditor::insertRecord()
-{
-    QTextCursor cursor(m_item.document());
-    cursor.beginEditBlock();
-    cursor.select(QTextCursor::Document);
-    cursor.removeSelectedText();
-    // Texts of a title often have the same height: with the last one's margins, the text that comes now need
-    // not be laid out again for its own.
-    QTextBlockFormat format = cursor.blockFormat();
-    format.setLeftMargin(BOUNDING_RECT_EXPAND_REGION_FOR_HANDLE);
-    format.setRightMargin(BOUNDING_RECT_EXPAND_REGION_FOR_HANDLE);
-    cursor.setBlockFormat(format);
-    for (int begin = 0; begin < m_styles.count();) {
-        QString text;
-        TextStyle& first = *m_styles.at(begin);
-        ensureFamily(first);
-        int end = begin;
-        do {
-            text += StyleDocument::textOf(*m_styles.at(end));
-            if (++end < m_styles.count())
-                ensureFamily(*m_styles.at(end));
-        } while (end < m_styles.count() && sameLayout(first, *m_styles.at(end)));
-        cursor.insertText(text, CharacterFormat::layoutFormat(first, m_item.canvasRatio()));
-        begin = end;
-    }
-    cursor.endEditBlock();
+    m_listener.familyReplaced(wanted);
 }
 
 void TextStyleEditor::initShowText()
 {
     const Guard guard(*this);
-    insertRecord();
+    for (TextStyle* style : m_styles.current().textItems())
+        ensureFamily(*style);
+    m_layout.insertRecord();
     if (m_styles.isEmpty() && !m_styles.lastAlpha().textItems().empty())
-        setCaretHeight(*m_styles.lastAlpha().textItems().front());
-    updateWidthAndAlign(0.0);
+        m_layout.setCaretHeight(*m_styles.lastAlpha().textItems().front());
+    m_layout.forgetWidth();
+    m_layout.updateWidthAndAlign();
     applyShadow();
 }
 
@@ -105,16 +79,12 @@ void TextStyleEditor::resetDocument(const TText& record, int cursorPosition)
     m_undoTimer.stop();
     m_styles.setCurrent(record);
     const TText& current = m_styles.current();
-    GraphicsText* parent = m_item.parentTextItem();
-    if (parent) {
-        parent->setPos(current.getXValue(), current.getYValue());
-        m_item.setPos(0.0, 0.0);
-    }
+    m_placement.placePair(QPointF(current.getXValue(), current.getYValue()));
     initShowText();
     if (cursorPosition >= 0) {
-        QTextCursor cursor = m_item.textCursor();
-        cursor.setPosition(std::min(cursorPosition, documentLength(*m_item.document())));
-        m_item.setTextCursor(cursor);
+        QTextCursor cursor = m_surface.selection();
+        cursor.setPosition(std::min(cursorPosition, documentLength(m_document)));
+        m_surface.select(cursor);
     }
 }
 
@@ -122,18 +92,17 @@ void TextStyleEditor::resetDocument(const TText& record, int cursorPosition)
 
 void TextStyleEditor::documentChanged(int position, int removed, int added)
 {
-    m_item.textPainter().invalidate();
     if (m_guard > 0 || (removed == 0 && added == 0))
         return;
     // The document counts its last paragraph in when it is filled for the first time.
     removed = std::clamp(removed, 0, std::max(m_styles.count() - position, 0));
-    added = std::max(documentLength(*m_item.document()) - (m_styles.count() - removed), 0);
+    added = std::max(documentLength(m_document) - (m_styles.count() - removed), 0);
     added = cutOffCharsBeyondMaxNum(position, added);
     trimUnchanged(position, removed, added);
     if (removed == 0 && added == 0)
         return;
 
-    m_item.touchEditor().clearHandleCaret();
+    m_listener.textTyped();
     m_undoFlag = 1;
     const bool previewTakenBack = m_styles.takeBackPreview(); // new characters do not take it over
     if (removed > 0 && added > 0) {
@@ -148,15 +117,15 @@ void TextStyleEditor::documentChanged(int position, int removed, int added)
     reconcile();
     if (previewTakenBack) {
         const Guard guard(*this);
-        applyFormats(0, m_styles.count());
+        m_layout.applyFormats(0, m_styles.count());
     }
     showCurrentTextStyle();
-    m_item.touchEditor().clearHandleCaret();
+    m_listener.textTyped();
 }
 
 void TextStyleEditor::repairTexts(int begin, int end)
 {
-    const QString text = m_item.toPlainText();
+    const QString text = m_document.toPlainText();
     for (int i = std::max(begin, 0); i < std::min({end, m_styles.count(), int(text.size())}); ++i) {
         const std::string wanted = StyleDocument::storedText(text, i).toStdString();
         if (m_styles.at(i)->getText() != wanted)
@@ -166,12 +135,12 @@ void TextStyleEditor::repairTexts(int begin, int end)
 
 int TextStyleEditor::cutOffCharsBeyondMaxNum(int position, int added)
 {
-    const QString text = m_item.toPlainText();
+    const QString text = m_document.toPlainText();
     const qsizetype characters = text.size() - text.count(QLatin1Char('\n'));
     if (characters <= CHARACTER_LIMIT)
         return added;
     // Only what has just come may go, from the cursor backwards.
-    QTextCursor cursor = m_item.textCursor();
+    QTextCursor cursor = m_surface.selection();
     const int end = cursor.position();
     int begin = end;
     for (qsizetype excess = characters - CHARACTER_LIMIT; excess > 0 && begin > position; --begin)
@@ -184,8 +153,8 @@ int TextStyleEditor::cutOffCharsBeyondMaxNum(int position, int added)
     cursor.setPosition(begin);
     cursor.setPosition(end, QTextCursor::KeepAnchor);
     cursor.removeSelectedText();
-    finishLayout();
-    updateWidthAndAlign(m_lastWidth);
+    m_layout.finishLayout();
+    m_layout.updateWidthAndAlign();
     return std::max(added - (end - begin), 0);
 }
 
@@ -193,10 +162,10 @@ int TextStyleEditor::cutOffCharsBeyondMaxNum(int position, int added)
 // but for what was committed. They would lose their styles.
 void TextStyleEditor::trimUnchanged(int& position, int& removed, int& added) const
 {
-    const QTextBlock block = m_item.document()->findBlock(position);
+    const QTextBlock block = m_document.findBlock(position);
     if (removed == 0 || added == 0 || position != block.position() || added < block.length() - 1)
         return;
-    const QString text = m_item.toPlainText();
+    const QString text = m_document.toPlainText();
     const auto isSame = [&](int style, int character) {
         return m_styles.at(style)->getText() == StyleDocument::storedText(text, character).toStdString();
     };
@@ -219,12 +188,12 @@ void TextStyleEditor::replaceCharacters(int position, int removed, int added)
     charsRemovedChange(position, removed);
     charsAddedChange(position, added);
     emitEdited(before, beforeLast);
-    Q_EMIT m_item.signalNotifyTextPropertyAreaObjectSelectionMode(false, false);
+    m_listener.selectionModeChanged(false, false);
 }
 
 void TextStyleEditor::reconcile()
 {
-    const int length = documentLength(*m_item.document());
+    const int length = documentLength(m_document);
     while (m_styles.count() > length)
         m_styles.remove(m_styles.count() - 1);
     if (m_styles.count() < length)
@@ -233,7 +202,7 @@ void TextStyleEditor::reconcile()
 
 bool TextStyleEditor::startsFilledLine(int position, int added) const
 {
-    const QTextBlock block = m_item.document()->findBlock(position);
+    const QTextBlock block = m_document.findBlock(position);
     return block.isValid() && block.position() == position && added < block.length() - 1;
 }
 
@@ -261,7 +230,7 @@ void TextStyleEditor::styleNewCharacter(int position, bool startOfLine, QChar ch
 void TextStyleEditor::charsAddedChange(int position, int added)
 {
     const Guard guard(*this);
-    const QString text = m_item.toPlainText().mid(position, added);
+    const QString text = m_document.toPlainText().mid(position, added);
     for (int i = 0; i < int(text.size()); ++i) {
         auto style = std::make_unique<TextStyle>();
         const int at = position + i;
@@ -272,10 +241,10 @@ void TextStyleEditor::charsAddedChange(int position, int added)
         m_styles.insert(at, std::move(one));
     }
     repairTexts(position - 1, position + int(text.size()) + 1);
-    applyFormats(position, position + int(text.size()));
+    m_layout.applyFormats(position, position + int(text.size()));
     if (!m_styles.isEmpty())
-        setCaretHeight(*m_styles.at(0));
-    updateWidthAndAlign(m_lastWidth);
+        m_layout.setCaretHeight(*m_styles.at(0));
+    m_layout.updateWidthAndAlign();
     applyShadow();
     m_styles.forgetNextInsert();
 }
@@ -287,25 +256,15 @@ void TextStyleEditor::charsRemovedChange(int position, int count)
     for (int i = 0; i < count; ++i) {
         if (m_styles.remove(position)) {
             emptied = true;
-            Q_EMIT m_item.signalNotifyTextPropertyAreaObjectSelectionMode(false, false);
+            m_listener.selectionModeChanged(false, false);
         }
     }
     if (emptied)
-        setCaretHeight(*m_styles.lastAlpha().textItems().front());
+        m_layout.setCaretHeight(*m_styles.lastAlpha().textItems().front());
     repairTexts(position - 1, position + 1);
-    finishLayout();
-    updateWidthAndAlign(m_lastWidth);
+    m_layout.finishLayout();
+    m_layout.updateWidthAndAlign();
     applyShadow();
-}
-
-void TextStyleEditor::setCaretHeight(const TextStyle& style)
-{
-    // The height of an empty line comes from the item's font; setting it lays the document out.
-    QFont font = m_item.font();
-    font.setFamily(QString::fromStdString(style.getFontFamily()));
-    font.setPixelSize(CharacterFormat::pixelSize(style, m_item.canvasRatio()));
-    if (font != m_item.font())
-        m_item.setFont(font);
 }
 
 void TextStyleEditor::setFontFamilyEnsureMode(int mode)
@@ -341,31 +300,10 @@ void TextStyleEditor::pushLastEditTextIntoStack()
 
 void TextStyleEditor::emitEdited(TText& before, TText& beforeLast)
 {
-    Q_EMIT m_item.signalObjectContentsEdited(&before, &m_styles.current(), &beforeLast,
-                                             &m_styles.lastAlpha());
+    m_listener.contentsEdited(before, m_styles.current(), beforeLast, m_styles.lastAlpha());
 }
 
 // Style changes
-
-void TextStyleEditor::applyFormats(int begin, int end)
-{
-    end = std::min(end, documentLength(*m_item.document()));
-    QTextCursor cursor(m_item.document());
-    cursor.beginEditBlock();
-    while (begin < end) {
-        const TextStyle* first = m_styles.at(begin);
-        if (!first)
-            break;
-        int next = begin + 1;
-        while (next < end && m_styles.at(next) && sameLayout(*first, *m_styles.at(next)))
-            ++next;
-        cursor.setPosition(begin);
-        cursor.setPosition(next, QTextCursor::KeepAnchor);
-        cursor.setCharFormat(CharacterFormat::layoutFormat(*first, m_item.canvasRatio()));
-        begin = next;
-    }
-    cursor.endEditBlock();
-}
 
 void TextStyleEditor::changeAllStyleWhenSelectionMode(const TText& source, int id, bool overall, int undoFlag)
 {
@@ -376,7 +314,7 @@ void TextStyleEditor::changeAllStyleWhenSelectionMode(const TText& source, int i
         return;
     }
     selectWholeText();
-    m_item.setFocusFlag(FocusObject);
+    m_surface.setFocusFlag(FocusObject);
     if (overall) {
         changeAllStyleWhenHasSelection(source, id);
     } else {
@@ -394,22 +332,24 @@ void TextStyleEditor::changeAllStyleWhenHasSelection(const TText& source, int id
     TText beforeLast = m_styles.lastAlpha();
     m_styles.setOverallProperty(id, source);
     // Only place and shadow depend on these properties, so the text stays laid out.
-    updateWidthAndAlign(m_styles.isEmpty() ? 0.0 : m_lastWidth);
+    if (m_styles.isEmpty())
+        m_layout.forgetWidth();
+    m_layout.updateWidthAndAlign();
     applyShadow();
-    const bool wasEdited = m_item.textInteractionFlags() == Qt::TextEditorInteraction;
-    m_item.setTextInteractionFlags(Qt::NoTextInteraction);
-    m_item.setFocusFlag(FocusObject);
+    const bool wasEdited = m_surface.isWritable();
+    m_surface.setWritable(false);
+    m_surface.setFocusFlag(FocusObject);
     showStyleOfWholeText();
-    m_item.parentFollows();
+    m_surface.parentFollows();
     TText after = m_styles.current();
-    Q_EMIT m_item.signalObjectContentsEdited(&before, &after, &beforeLast, &m_styles.lastAlpha());
+    m_listener.contentsEdited(before, after, beforeLast, m_styles.lastAlpha());
     // The next step starts here, also when the last change was a preview.
     m_styles.refreshUndoBaseline();
-    Q_EMIT m_item.signalNotifyTextPropertyAreaObjectSelectionMode(true, true);
+    m_listener.selectionModeChanged(true, true);
     m_styles.forgetNextInsert();
     // The object is selected now, and nothing can be typed into it.
     if (wasEdited)
-        Q_EMIT m_item.signalNotifySceneCurrentObjectInEditMode(nullptr);
+        m_listener.keyboardWanted(false);
 }
 
 void TextStyleEditor::changePartStyleWhenHasSelection(const TText& source, int id, int undoFlag)
@@ -420,7 +360,7 @@ void TextStyleEditor::changePartStyleWhenHasSelection(const TText& source, int i
     else
         cancelPreview(); // the step of undo leads from before the preview to this change
     m_undoFlag = undoFlag;
-    const QTextCursor cursor = m_item.textCursor();
+    const QTextCursor cursor = m_surface.selection();
     const Guard guard(*this);
     TText before = m_styles.undoBaseline();
     TText beforeLast = m_styles.lastAlpha();
@@ -431,7 +371,7 @@ void TextStyleEditor::changePartStyleWhenHasSelection(const TText& source, int i
         m_styles.refreshUndoBaseline();
     }
     m_styles.forgetNextInsert();
-    m_item.update();
+    m_surface.repaint();
 }
 
 void TextStyleEditor::cancelPreview()
@@ -439,8 +379,8 @@ void TextStyleEditor::cancelPreview()
     if (!m_styles.takeBackPreview())
         return;
     const Guard guard(*this);
-    applyFormats(0, m_styles.count());
-    updateWidthAndAlign(m_lastWidth);
+    m_layout.applyFormats(0, m_styles.count());
+    m_layout.updateWidthAndAlign();
     applyShadow();
     m_undoFlag = CommittedChange;
     m_styles.refreshUndoBaseline();
@@ -459,8 +399,8 @@ void TextStyleEditor::changeSelectionProperty(int id, const TText& source, int f
         StyleDocument::setCharacterProperty(id, *m_styles.at(i), *given[size_t(i - begin)]);
         ensureFamily(*m_styles.at(i));
     }
-    applyFormats(begin, end);
-    updateWidthAndAlign(m_lastWidth);
+    m_layout.applyFormats(begin, end);
+    m_layout.updateWidthAndAlign();
 }
 
 void TextStyleEditor::changeSelectionPropertyWhenObjectIsEmpty(int id, const TText& source)
@@ -469,18 +409,18 @@ void TextStyleEditor::changeSelectionPropertyWhenObjectIsEmpty(int id, const TTe
         return;
     StyleDocument::setCharacterProperty(id, *m_styles.at(0), *source.textItems().front());
     ensureFamily(*m_styles.at(0));
-    applyFormats(0, 1);
-    setCaretHeight(*m_styles.at(0));
-    updateWidthAndAlign(m_lastWidth);
+    m_layout.applyFormats(0, 1);
+    m_layout.setCaretHeight(*m_styles.at(0));
+    m_layout.updateWidthAndAlign();
 }
 
 void TextStyleEditor::saveStyleForNextInsert(const TText& style, int undoFlag, int id)
 {
     if (undoFlag != 1)
         return;
-    m_styles.saveForNextInsert(style, id, m_item.textCursor().position());
+    m_styles.saveForNextInsert(style, id, m_surface.selection().position());
     if (!style.textItems().empty())
-        setCaretHeight(*style.textItems().front());
+        m_layout.setCaretHeight(*style.textItems().front());
 }
 
 void TextStyleEditor::changeTextItemPosition(float x, float y)
@@ -488,17 +428,16 @@ void TextStyleEditor::changeTextItemPosition(float x, float y)
     pushLastEditTextIntoStack();
     TText& current = m_styles.current();
     const QPointF old(current.getXValue(), current.getYValue());
-    TouchTextEditor& touch = m_item.touchEditor();
-    const int side = touch.itemIsOutOfRange(QPointF(x, y));
-    if (side == 0)
-        m_item.placedItem()->setPos(x, y);
+    const TextPlacement::Side side = m_placement.itemIsOutOfRange(QPointF(x, y));
+    if (side == TextPlacement::Inside)
+        m_placement.setPlace(QPointF(x, y));
     else
-        touch.adjustItemPos(side);
-    const QPointF now = m_item.scenePos();
+        m_placement.adjustItemPos(side);
+    const QPointF now = m_placement.textPlace();
     current.setXValue(float(now.x()));
     current.setYValue(float(now.y()));
-    touch.clearPositionChanged();
-    Q_EMIT m_item.signalObjectPositionChanged(current.getTextObjectID(), old, now);
+    m_placement.clearMoved();
+    m_listener.objectMoved(old, now);
 }
 
 void TextStyleEditor::reportMovedObject()
@@ -507,7 +446,7 @@ void TextStyleEditor::reportMovedObject()
     TText report = m_styles.isEmpty() ? m_styles.nextInsert() : current;
     report.setXValue(current.getXValue());
     report.setYValue(current.getYValue());
-    Q_EMIT m_item.signalNotifyPropertyAreaObjectSelectionStyleChange(&report);
+    m_listener.styleShown(report);
     m_styles.refreshUndoBaseline();
 }
 
@@ -517,7 +456,7 @@ void TextStyleEditor::reportStyle(const TextStyle& style)
 {
     TText report;
     m_styles.copyTextStyle(report, style);
-    Q_EMIT m_item.signalNotifyPropertyAreaObjectSelectionStyleChange(&report);
+    m_listener.styleShown(report);
 }
 
 void TextStyleEditor::showTextStyleOfCursorPosition(const QTextCursor& cursor)
@@ -529,7 +468,7 @@ void TextStyleEditor::showTextStyleOfCursorPosition(const QTextCursor& cursor)
     }
     m_styles.forgetNextInsert();
     m_styles.setSavedCursorPosition(-2);
-    if (m_item.textInteractionFlags() != Qt::TextEditorInteraction)
+    if (!m_surface.isWritable())
         return;
     if (const TextStyle* style = m_styles.at(std::max(cursor.position() - 1, 0)))
         reportStyle(*style);
@@ -537,19 +476,19 @@ void TextStyleEditor::showTextStyleOfCursorPosition(const QTextCursor& cursor)
 
 void TextStyleEditor::showCurrentTextStyle()
 {
-    const QTextCursor cursor = m_item.textCursor();
+    const QTextCursor cursor = m_surface.selection();
     if (m_styles.isEmpty()) {
         TText report = m_styles.lastAlpha();
         report.setXValue(m_styles.current().getXValue());
         report.setYValue(m_styles.current().getYValue());
-        Q_EMIT m_item.signalNotifyPropertyAreaObjectSelectionStyleChange(&report);
+        m_listener.styleShown(report);
     } else if (!cursor.hasSelection()) {
         showTextStyleOfCursorPosition(cursor);
     } else {
         m_styles.setSavedCursorPosition(-2);
         TText report;
         m_styles.copySelection(report, cursor.selectionStart(), cursor.selectionEnd());
-        Q_EMIT m_item.signalNotifyPropertyAreaObjectSelectionStyleChange(&report);
+        m_listener.styleShown(report);
     }
     if (m_undoFlag == 1)
         m_styles.refreshUndoBaseline();
@@ -557,16 +496,16 @@ void TextStyleEditor::showCurrentTextStyle()
 
 void TextStyleEditor::selectWholeText()
 {
-    QTextCursor cursor = m_item.textCursor();
+    QTextCursor cursor = m_surface.selection();
     cursor.select(QTextCursor::Document);
-    m_item.setTextCursor(cursor);
+    m_surface.select(cursor);
 }
 
 void TextStyleEditor::clearSelection()
 {
-    QTextCursor cursor = m_item.textCursor();
+    QTextCursor cursor = m_surface.selection();
     cursor.clearSelection();
-    m_item.setTextCursor(cursor);
+    m_surface.select(cursor);
 }
 
 void TextStyleEditor::showStyleOfWholeText()
@@ -576,104 +515,9 @@ void TextStyleEditor::showStyleOfWholeText()
     clearSelection();
 }
 
-// Layout
-
-void TextStyleEditor::updateWidthAndAlign(double oldWidth)
-{
-    const Guard guard(*this);
-    m_item.announceGeometryChange();
-    adjustLeftAndRightMargin();
-    const double width = naturalWidth();
-    if (m_item.textWidth() != width)
-        m_item.setTextWidth(width);
-    setDocumentAlign(oldWidth, width);
-    m_lastWidth = width;
-    if (GraphicsText* parent = m_item.parentTextItem())
-        parent->setTextWidth(width);
-    m_item.parentFollows();
-    m_item.textPainter().invalidate();
-    m_item.update();
-}
-
-// The width that the document has without a text width. Lines never wrap, so they tell it whatever width is
-// set, and the document need not be laid out twice. Margins count in 64ths of a pixel, as the layout rounds
-// them.
-double TextStyleEditor::naturalWidth() const
-{
-    const auto rounded = [](double margin) { return std::floor(margin * 64.0) / 64.0; };
-    const QTextDocument& document = *m_item.document();
-    double widest = 0.0;
-    for (QTextBlock block = document.begin(); block.isValid(); block = block.next()) {
-        const QTextBlockFormat format = block.blockFormat();
-        const double margins = rounded(format.leftMargin()) + rounded(format.rightMargin());
-        for (int i = 0; i < block.layout()->lineCount(); ++i)
-            widest = std::max(widest, block.layout()->lineAt(i).naturalTextWidth() + margins);
-    }
-    return widest + 2.0 * rounded(document.documentMargin());
-}
-
-// While the document reports a removal it has not laid itself out yet; a change of width makes it do so.
-void TextStyleEditor::finishLayout()
-{
-    m_item.setTextWidth(-1.0);
-}
-
-void TextStyleEditor::adjustLeftAndRightMargin()
-{
-    QTextDocument& document = *m_item.document();
-    double tallest = 0.0;
-    for (QTextBlock block = document.begin(); block.isValid(); block = block.next()) {
-        if (block.layout()->lineCount() > 0)
-            tallest = std::max(tallest, block.layout()->lineAt(0).height());
-    }
-    BOUNDING_RECT_EXPAND_REGION = MARGIN_SHARE_OF_LINE * tallest;
-    BOUNDING_RECT_EXPAND_REGION_FOR_HANDLE = BOUNDING_RECT_EXPAND_REGION / 2.0;
-    const double margin = BOUNDING_RECT_EXPAND_REGION_FOR_HANDLE;
-
-    QTextCursor cursor(&document);
-    cursor.beginEditBlock();
-    for (QTextBlock block = document.begin(); block.isValid(); block = block.next()) {
-        QTextBlockFormat format = block.blockFormat();
-        if (qFuzzyCompare(format.leftMargin(), margin) && qFuzzyCompare(format.rightMargin(), margin))
-            continue;
-        format.setLeftMargin(margin);
-        format.setRightMargin(margin);
-        cursor.setPosition(block.position());
-        cursor.setBlockFormat(format);
-    }
-    cursor.endEditBlock();
-}
-
-void TextStyleEditor::setDocumentAlign(double oldWidth, double width)
-{
-    const int align = m_styles.current().getTextAlign();
-    const Qt::Alignment wanted =
-        align == 0 ? Qt::AlignHCenter : (align == 1 ? Qt::AlignRight : Qt::AlignLeft);
-    QTextOption option = m_item.document()->defaultTextOption();
-    if (option.alignment() != wanted) {
-        option.setAlignment(wanted);
-        m_item.document()->setDefaultTextOption(option);
-        if (GraphicsText* parent = m_item.parentTextItem())
-            parent->document()->setDefaultTextOption(option);
-    }
-    GraphicsText* parent = m_item.parentTextItem();
-    if (!parent || oldWidth == 0.0 || (align != 0 && align != 1))
-        return;
-    const double shift = (oldWidth - width) * (align == 0 ? CENTERPERCNTAGE : 1.0);
-    if (shift == 0.0)
-        return;
-    parent->moveBy(shift, 0.0);
-    m_styles.current().setXValue(float(m_item.scenePos().x()));
-}
-
 void TextStyleEditor::applyShadow()
 {
     TText& record = m_styles.isEmpty() ? m_styles.lastAlpha() : m_styles.current();
     StyleDocument::setItemShadowInfo(record);
-    const TShadow& shadow = *record.getTextShadow();
-    QGraphicsDropShadowEffect& effect = *m_item.shadowEffect();
-    effect.setOffset(shadow.getShadowDirectionX() * m_item.canvasRatio(),
-                     shadow.getShadowDirectionY() * m_item.canvasRatio());
-    effect.setBlurRadius(shadow.getShadowBlurRadius());
-    effect.setEnabled(shadow.getShadowDirectionX() != 0 || shadow.getShadowDirectionY() != 0);
+    m_surface.showShadow(*record.getTextShadow());
 }

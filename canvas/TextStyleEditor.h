@@ -1,21 +1,20 @@
 #pragma once
 
-#include "canvas/TextObjectConstants.h"
+#include "canvas/RecordLayout.h"
+#include "canvas/TextObjectParts.h"
 #include "document/TText.h"
 
-#include <QTextCursor>
 #include <QTimer>
 
-class GraphicsText;
-class StyleDocument;
+class QTextCursor;
 
 // Keeps the Qt document of a text object and its style record in step: typing goes from the document into the
 // record, style changes and loading from the record into the document. Also forms the undo steps of typing.
-// Lengths are item coordinates. GUI thread only.
-class TextStyleEditor : public TextObjectConstants
+// GUI thread only.
+class TextStyleEditor
 {
 public:
-    explicit TextStyleEditor(GraphicsText& item);
+    explicit TextStyleEditor(const TextObjectParts& parts);
 
     void initShowText();
     void resetDocument(const TText& record, int cursorPosition);
@@ -31,23 +30,25 @@ public:
     void cancelPreview();
     void setFontFamilyEnsureMode(int mode);
 
-    // Tells the panel the style at the cursor or of the selection.
+    // Reports the style at the cursor or of the selection.
     void showCurrentTextStyle();
     // The same for the whole text, leaving no selection.
     void showStyleOfWholeText();
     void selectWholeText();
     void clearSelection();
-    // Tells the panel the object's style with its place, which becomes the state that undo returns to.
+    // Reports the object's style with its place, which becomes the state that undo returns to.
     void reportMovedObject();
     // Offset (0,0) switches the shadow off.
     void applyShadow();
 
     // Typing up to now becomes an undo step.
     void pushLastEditTextIntoStack();
+    // Its timeout has to call undoTimeOut().
+    const QTimer& undoTimer() const { return m_undoTimer; }
     void undoTimeOut();
-    // Whether there is typing that no undo step has taken in yet.
+    // Whether there is typing that is not part of an undo step yet.
     bool isTyping() const { return m_undoTimer.isActive(); }
-    // Forgets typing that has not become a step: the object is going away.
+    // Forgets typing that has not become a step: the object is about to be hidden.
     void discardBurst() { m_undoTimer.stop(); }
 
 private:
@@ -55,8 +56,6 @@ private:
 
     // Substitutes a missing family and reports it.
     void ensureFamily(TextStyle& style);
-    void insertRecord();
-    void applyFormats(int begin, int end);
     int cutOffCharsBeyondMaxNum(int position, int added);
     // Leaves out of a reported change what is as it was.
     void trimUnchanged(int& position, int& removed, int& added) const;
@@ -66,26 +65,23 @@ private:
     void styleNewCharacter(int position, bool startOfLine, QChar character, TextStyle& style);
     bool startsFilledLine(int position, int added) const;
     void reconcile();
-    // The texts of the styles there follow the document: a change may have parted or joined a pair.
+    // Brings the texts of the styles there up to date: a change may have parted or joined a pair.
     void repairTexts(int begin, int end);
     void startBurst();
     void changeSelectionProperty(int id, const TText& source, int from, int to);
     void changeSelectionPropertyWhenObjectIsEmpty(int id, const TText& source);
     void changeTextItemPosition(float x, float y);
-    void updateWidthAndAlign(double oldWidth);
-    double naturalWidth() const;
-    void finishLayout();
-    void adjustLeftAndRightMargin();
-    void setDocumentAlign(double oldWidth, double width);
-    void setCaretHeight(const TextStyle& style);
     void reportStyle(const TextStyle& style);
     void showTextStyleOfCursorPosition(const QTextCursor& cursor);
     void emitEdited(TText& before, TText& beforeLast);
 
-    GraphicsText& m_item;
+    QTextDocument& m_document;
     StyleDocument& m_styles;
+    TextPlacement& m_placement;
+    ITextSurface& m_surface;
+    ITextObjectListener& m_listener;
+    RecordLayout m_layout;
     QTimer m_undoTimer;
-    double m_lastWidth = 0.0;
     int m_guard = 0;
     int m_undoFlag = 1;
     int m_ensureMode = 2;

@@ -3,26 +3,32 @@
 #include <QLineF>
 #include <QPointF>
 
-// Touch state of one text object: what the finger does and what the selection handles show. Item coordinates
-// unless said otherwise.
+// What the finger does to one text object and what the selection handles show. Item coordinates unless said
+// otherwise.
 struct TouchState {
+    // What the finger on the object does now.
+    enum class Gesture {
+        None,        // it is up
+        Press,       // it came down and has done nothing yet
+        LongPress,   // it stayed until a character was selected
+        MoveObject,  // it drags the selected object
+        HandlePress, // it came down on a handle
+        HandleDrag,  // it drags the handle, and no character is selected yet
+        Select,      // it drags the end of the selection
+        DoubleTap    // it came down for the second time and selected the whole text
+    };
+    Gesture gesture = Gesture::None;
+
+    bool isHandleHeld() const { return gesture == Gesture::HandlePress || gesture == Gesture::HandleDrag; }
+    // The selection has been taken over from its fixed end.
+    bool isSelecting() const { return gesture == Gesture::HandleDrag || gesture == Gesture::Select; }
+
     // Handles are shown for a selection.
     bool handleCaret = false;
-    bool handleMoving = false;
-    // A move has begun with a selection present.
-    bool selectionMoved = false;
-    bool longPressed = false;
-    bool released = false;
-    bool moved = false;
-    bool pressed = false;
-    // Until the next release.
-    bool doubleClicked = false;
-    // Chooses what the keyboard is told.
+    // Chooses what the keyboard is sent.
     bool doubleClickedSelection = false;
-    // The release that entered edit mode places the cursor.
-    bool tapPlacesCursor = false;
-    bool movedWhileSelected = false;
-    bool positionChanged = false;
+    // The keyboard was asked for since the finger came down, with the selection saved below.
+    bool keyboardAsked = false;
 
     // The fixed and the moving end of the selection: position, block, caret, top left of the handle.
     struct End {
@@ -34,18 +40,13 @@ struct TouchState {
     End previous;
     End current;
 
-    // The keyboard was asked for since the finger went down, with the selection saved below.
-    bool keyboardAsked = false;
     // Selection that the keyboard knows.
     int savedSelectionStart = -1;
     int savedSelectionEnd = -1;
-    int pressCursor = -2;
+
     QPointF pressPoint;
     // Of the placed object, in scene coordinates.
     QPointF placeAtPress;
-
     // Scene coordinates.
     QPointF lastDragPoint;
-    QPointF lastScenePos;
-    QPointF newScenePos;
 };

@@ -1,10 +1,12 @@
 #include "canvas/TouchTextEditor.h"
 
-#include "canvas/GraphicsText.h"
+#include "canvas/CaretGeometry.h"
+#include "canvas/ITextObjectListener.h"
+#include "canvas/ITextSurface.h"
 #include "canvas/StyleDocument.h"
-#include "canvas/TextPainter.h"
+#include "canvas/TextObjectConstants.h"
+#include "canvas/TextPlacement.h"
 #include "canvas/TextStyleEditor.h"
-#include "support/LogManager.h"
 
 #include <QGraphicsSceneMouseEvent>
 #include <QKeyEvent>
@@ -13,6 +15,10 @@
 #include <QTextDocument>
 #include <QTextLayout>
 #include <algorithm>
+#include <utility>
+
+using namespace TextObjectConstants;
+using Gesture = TouchState::Gesture;
 
 namespace
 {
@@ -20,10 +26,6 @@ namespace
 // Around the picture of a handle that still counts as the handle.
 constexpr double HandleTolerance = 8.0;
 constexpr double CaretShift = 1.0;
-// How far the finger moves on after the limits of an object's left and upper side before it takes the object
-// along.
-constexpr double LeftReturnFactor = 2.0;
-constexpr double TopReturnFactor = 3.0;
 
 bool isMouseEvent(QEvent::Type type)
 {
@@ -44,11 +46,18 @@ bool isRightMouseEvent(const QEvent* event)
 
 } // namespace
 
-TouchTextEditor::TouchTextEditor(GraphicsText& item) : m_item(item), m_caretPainter(item, m_state)
+TouchTextEditor::TouchTextEditor(const TextObjectParts& parts, TextStyleEditor& styleEditor)
+    : m_document(parts.document)
+    , m_styles(parts.styles)
+    , m_carets(parts.carets)
+    , m_placement(parts.placement)
+    , m_surface(parts.surface)
+    , m_listener(parts.listener)
+    , m_styleEditor(styleEditor)
+    , m_caretPainter(parts, m_state)
 {
     m_longPressTimer.setSingleShot(true);
     m_longPressTimer.setInterval(LONG_PRESS_TIME);
-    QObject::connect(&m_longPressTimer, &QTimer::timeout, &item, &GraphicsText::slotLongPressed);
 }
 
 // Press
@@ -56,27 +65,27 @@ TouchTextEditor::TouchTextEditor(GraphicsText& item) : m_item(item), m_caretPain
 void TouchTextEditor::mousePress(QGraphicsSceneMouseEvent* event)
 {
     m_state.doubleClickedSelection = false;
-    m_state.pressed = true;
-    m_state.pressPoint = event->pos();
-    m_state.placeAtPress = m_item.placedItem()->pos();
-    const QTextCursor cursor = m_item.textCursor();
-    if (!cursor.hasSelection() && m_item.getFocusFlag() == FocusEdit)
-        m_longPressTimer.start();
-    m_item.update();
-    if (cursor.hasSelection())
-        m_state.pressCursor = cursor.position();
-    m_state.released = false;
-    m_state.moved = false;
-    m_state.selectionMoved = false;
-    m_state.handleMoving = false;
     m_state.keyboardAsked = false;
-    adjustMousePressedPos(event, changePaintStateWhenHandleIsPressed(event->pos()));
-    m_item.QGraphicsTextItem::mousePressEvent(event);
-    m_state.lastScenePos = event->scenePos();
-    m_item.styleEditor().clearSelection();
-    Q_EMIT m_item.signalNotifySceneCurrentMousePressedObjectId(m_item.getItemTText()->getTextObjectID());
-    m_item.setFlag(QGraphicsItem::ItemIsMovable, m_item.getFocusFlag() == FocusObject);
-    m_item.update();
+    m_state.pressPoint = event->pos();
+    m_state.placeAtPress = m_placement.place();
+    if (!m_surface.selection().hasSelection() && m_surface.getFocusFlag() == FocusEdit)
+        m_longPressTimer.start();
+    const HandleHit hit = changePaintStateWhenHandleIsPressed(event->pos());
+    switch (hit) {
+    case PreviousHandle:
+    case CurrentHandle:
+        m_state.gesture = Gesture::HandlePress;
+        break;
+    case NoHandle:
+        m_state.gesture = Gesture::Press;
+        break;
+    }
+    adjustMousePressedPos(event, hit);
+    m_surface.handleByTextItem(QEvent::GraphicsSceneMousePress, *event);
+    m_styleEditor.clearSelection();
+    m_listener.objectPressed();
+    m_placement.setMovable(m_surface.getFocusFlag() == FocusObject);
+    m_surface.repaint();
 }
 
 bool TouchTextEditor::handleIsHit(const TouchState::End& end, QPointF point)
@@ -89,22 +98,20 @@ bool TouchTextEditor::handleIsHit(const TouchState::End& end, QPointF point)
 TouchTextEditor::HandleHit TouchTextEditor::changePaintStateWhenHandleIsPressed(QPointF point)
 {
     m_caretPainter.refreshHandles();
-    const bool selecting = m_item.textCursor().hasSelection();
+    const bool selecting = m_surface.selection().hasSelection();
     m_state.handleCaret = false;
     if (!selecting || m_state.previous.position < 0 || m_state.current.position < 0)
         return NoHandle;
     if (handleIsHit(m_state.previous, point)) {
         const int wanted = m_state.current.position;
         putCursor(wanted);
-        m_state.handleMoving = true;
         // The pressed handle is always the current one.
-        if (m_item.textCursor().position() == wanted)
+        if (m_surface.selection().position() == wanted)
             exchangeValueofCurrentAndPreviousCursor();
         return PreviousHandle;
     }
     if (handleIsHit(m_state.current, point)) {
         putCursor(m_state.previous.position);
-        m_state.handleMoving = true;
         return CurrentHandle;
     }
     return NoHandle;
@@ -118,7 +125,7 @@ void TouchTextEditor::exchangeValueofCurrentAndPreviousCursor()
 void TouchTextEditor::moveUpEventPosWhenHasHandleCaret(QGraphicsSceneMouseEvent* event) const
 {
     // The caret runs above the finger, where it can be seen.
-    if (m_state.handleCaret || m_state.handleMoving)
+    if (m_state.handleCaret || m_state.isHandleHeld())
         event->setPos(event->pos() - QPointF(0.0, HANDLEPIXMAPHEIGHT));
 }
 
@@ -127,7 +134,7 @@ void TouchTextEditor::adjustMousePressedPos(QGraphicsSceneMouseEvent* event, Han
     moveUpEventPosWhenHasHandleCaret(event);
     if (hit == NoHandle)
         return;
-    const QTextBlock block = m_item.document()->findBlock(m_state.current.position);
+    const QTextBlock block = m_document.findBlock(m_state.current.position);
     if (m_state.current.position == block.position())
         event->setPos(event->pos() + QPointF(HANDLEPIXMAPWIDTH, 0.0));
     else if (m_state.current.position == block.position() + block.length() - 1)
@@ -136,18 +143,17 @@ void TouchTextEditor::adjustMousePressedPos(QGraphicsSceneMouseEvent* event, Han
 
 void TouchTextEditor::putCursor(int position)
 {
-    QTextCursor cursor = m_item.textCursor();
+    QTextCursor cursor = m_surface.selection();
     cursor.setPosition(clampedPosition(position));
-    m_item.setTextCursor(cursor);
+    m_surface.select(cursor);
 }
 
 int TouchTextEditor::clampedPosition(int position) const
 {
-    const QTextDocument& document = *m_item.document();
-    position = std::clamp(position, 0, document.characterCount() - 1);
+    position = std::clamp(position, 0, m_document.characterCount() - 1);
     // Nothing can be typed into the middle of a character; services count characters in their own ways.
-    const bool insidePair = position > 0 && document.characterAt(position).isLowSurrogate() &&
-                            document.characterAt(position - 1).isHighSurrogate();
+    const bool insidePair = position > 0 && m_document.characterAt(position).isLowSurrogate() &&
+                            m_document.characterAt(position - 1).isHighSurrogate();
     return insidePair ? position - 1 : position;
 }
 
@@ -155,44 +161,50 @@ int TouchTextEditor::clampedPosition(int position) const
 
 void TouchTextEditor::mouseMove(QGraphicsSceneMouseEvent* event)
 {
-    m_item.update();
-    m_state.released = false;
-    m_state.moved = true;
-    if (m_item.getFocusFlag() == FocusObject)
-        m_state.movedWhileSelected = true;
-    m_state.pressed = false;
-    if ((m_caretPainter.noHandleCursor() && m_item.getFocusFlag() != FocusObject) || m_state.doubleClicked)
-        return;
-    moveUpEventPosWhenHasHandleCaret(event);
-    m_state.lastScenePos = event->lastScenePos();
-    m_item.QGraphicsTextItem::mouseMoveEvent(event);
-    m_state.newScenePos = event->scenePos();
-    resetItemPos();
-    if (m_item.textCursor().hasSelection() && !m_state.selectionMoved) {
-        m_state.selectionMoved = true;
-        putCursor(m_state.previous.position);
+    m_surface.repaint();
+    const bool isSelected = m_surface.getFocusFlag() == FocusObject;
+    if (isSelected && m_state.gesture != Gesture::DoubleTap)
+        m_state.gesture = Gesture::MoveObject;
+    switch (m_state.gesture) {
+    case Gesture::DoubleTap:
+        break;
+    case Gesture::MoveObject:
+        if (isSelected) // else the selection ended under the finger
+            dragObject(event);
+        break;
+    default:
+        if (!m_caretPainter.noHandleCursor())
+            dragSelection(event);
+        break;
     }
-    synchronizeKeyBoardCursorPos();
 }
 
-void TouchTextEditor::resetItemPos()
+void TouchTextEditor::dragObject(QGraphicsSceneMouseEvent* event)
 {
-    GraphicsText* parent = m_item.parentTextItem();
-    if (m_item.getFocusFlag() != FocusObject || !parent)
+    moveUpEventPosWhenHasHandleCaret(event);
+    m_surface.handleByTextItem(QEvent::GraphicsSceneMouseMove, *event);
+    m_placement.followFinger(event->scenePos() - event->lastScenePos());
+}
+
+void TouchTextEditor::dragSelection(QGraphicsSceneMouseEvent* event)
+{
+    moveUpEventPosWhenHasHandleCaret(event);
+    m_surface.handleByTextItem(QEvent::GraphicsSceneMouseMove, *event);
+    if (!m_surface.selection().hasSelection())
         return;
-    parent->setPos(parent->scenePos() + m_state.newScenePos - m_state.lastScenePos);
-    m_item.setPos(0.0, 0.0);
-    parent->update();
+    if (m_state.isSelecting()) {
+        synchronizeKeyBoardCursorPos();
+        return;
+    }
+    // What is selected from now on begins at the fixed end.
+    m_state.gesture = m_state.isHandleHeld() ? Gesture::HandleDrag : Gesture::Select;
+    putCursor(m_state.previous.position);
 }
 
 void TouchTextEditor::synchronizeKeyBoardCursorPos()
 {
-    const QTextCursor cursor = m_item.textCursor();
-    if (!cursor.hasSelection())
-        return;
-    m_state.handleMoving = false;
+    m_state.gesture = Gesture::Select;
     m_state.handleCaret = true;
-    m_state.longPressed = false;
     if (!selectionIsSaved())
         requestKeyboardForSelection();
     m_longPressTimer.stop();
@@ -200,7 +212,7 @@ void TouchTextEditor::synchronizeKeyBoardCursorPos()
 
 bool TouchTextEditor::selectionIsSaved() const
 {
-    const QTextCursor cursor = m_item.textCursor();
+    const QTextCursor cursor = m_surface.selection();
     return cursor.selectionStart() == m_state.savedSelectionStart &&
            cursor.selectionEnd() == m_state.savedSelectionEnd;
 }
@@ -208,7 +220,7 @@ bool TouchTextEditor::selectionIsSaved() const
 void TouchTextEditor::requestKeyboardForSelection()
 {
     requestKeyboard();
-    const QTextCursor cursor = m_item.textCursor();
+    const QTextCursor cursor = m_surface.selection();
     m_state.savedSelectionStart = cursor.selectionStart();
     m_state.savedSelectionEnd = cursor.selectionEnd();
     m_state.keyboardAsked = true;
@@ -216,7 +228,7 @@ void TouchTextEditor::requestKeyboardForSelection()
 
 void TouchTextEditor::requestKeyboard()
 {
-    Q_EMIT m_item.signalNotifySceneCurrentObjectInEditMode(&m_item);
+    m_listener.keyboardWanted(true);
 }
 
 bool TouchTextEditor::filter(QEvent* event)
@@ -230,7 +242,7 @@ bool TouchTextEditor::filter(QEvent* event)
     if (event->type() != QEvent::GraphicsSceneMouseMove)
         return false;
     auto* mouse = static_cast<QGraphicsSceneMouseEvent*>(event);
-    if (m_item.getFocusFlag() == FocusObject)
+    if (m_surface.getFocusFlag() == FocusObject)
         return filterDrag(*mouse);
     makeMouseMoveYPosInsideTextObject(mouse);
     return false;
@@ -238,8 +250,8 @@ bool TouchTextEditor::filter(QEvent* event)
 
 void TouchTextEditor::makeMouseMoveYPosInsideTextObject(QGraphicsSceneMouseEvent* event) const
 {
-    const QRectF area = m_item.layoutRect();
-    const double margin = m_item.document()->documentMargin();
+    const QRectF area = m_placement.area();
+    const double margin = m_document.documentMargin();
     QPointF point = event->pos();
     if (point.y() > area.bottom())
         point.setY(area.height() - margin / 2.0);
@@ -248,89 +260,44 @@ void TouchTextEditor::makeMouseMoveYPosInsideTextObject(QGraphicsSceneMouseEvent
     else
         return;
     event->setPos(point);
-    event->setScenePos(m_item.mapToScene(point));
+    event->setScenePos(m_placement.mapToScene(point));
 }
 
 bool TouchTextEditor::filterDrag(const QGraphicsSceneMouseEvent& event)
 {
     const QPointF mapped = event.scenePos();
-    const QPointF proposed = m_item.scenePos() + mapped - m_state.lastDragPoint;
+    const QPointF proposed = m_placement.textPlace() + mapped - m_state.lastDragPoint;
     m_state.lastDragPoint = mapped;
-    const int side = itemIsOutOfRange(proposed);
-    if (side == 0)
+    const TextPlacement::Side side = m_placement.itemIsOutOfRange(proposed);
+    if (side == TextPlacement::Inside)
         return false;
     // A drag against the limit is a drag all the same.
-    m_state.movedWhileSelected = true;
-    adjustItemPos(side);
+    if (m_state.gesture != Gesture::DoubleTap)
+        m_state.gesture = Gesture::MoveObject;
+    m_state.lastDragPoint = m_placement.adjustItemPos(side);
     return true;
-}
-
-int TouchTextEditor::itemIsOutOfRange(QPointF position) const
-{
-    const QSizeF size = m_item.layoutRect().size();
-    int side = 0;
-    if (position.x() < SCENE_RECT.left() - (size.width() - LIMITEDNUM))
-        side = 1;
-    else if (position.x() > SCENE_RECT.width() - LIMITEDNUM)
-        side = 2;
-    if (position.y() < SCENE_RECT.top() - (size.height() - LIMITEDNUM))
-        side = 3;
-    else if (position.y() > SCENE_RECT.height() - LIMITEDNUM)
-        side = 4;
-    return side;
-}
-
-void TouchTextEditor::adjustItemPos(int side)
-{
-    QGraphicsItem* placed = m_item.placedItem();
-    const QSizeF size = m_item.layoutRect().size();
-    const QPointF before = placed->pos();
-    switch (side) {
-    case 1:
-        placed->setX(SCENE_RECT.left() - (size.width() - LIMITEDNUM));
-        m_state.lastDragPoint =
-            m_item.scenePos() + QPointF(LeftReturnFactor * (size.width() - LIMITEDNUM), 0.0);
-        break;
-    case 2:
-        placed->setX(SCENE_RECT.width() - LIMITEDNUM);
-        m_state.lastDragPoint = m_item.scenePos();
-        break;
-    case 3:
-        placed->setY(SCENE_RECT.top() - (size.height() - LIMITEDNUM));
-        m_state.lastDragPoint =
-            m_item.scenePos() + QPointF(0.0, TopReturnFactor * (size.height() - LIMITEDNUM));
-        break;
-    case 4:
-        placed->setY(SCENE_RECT.height() - LIMITEDNUM);
-        m_state.lastDragPoint = m_item.scenePos();
-        break;
-    default:
-        return;
-    }
-    if (placed->pos() != before)
-        markPositionChanged();
 }
 
 // Release
 
 void TouchTextEditor::mouseRelease(QGraphicsSceneMouseEvent* event)
 {
-    m_state.pressed = false;
-    m_state.selectionMoved = false;
-    m_state.released = true;
-    m_state.moved = false;
-    m_state.handleMoving = false;
-    setBoundingRectLineStatus();
+    const Gesture ended = std::exchange(m_state.gesture, Gesture::None);
+    const bool tapPlacesCursor = setBoundingRectLineStatus(ended);
     savePostionMoveUndoCommandWhenPositionChanged();
     moveUpEventPosWhenHasHandleCaret(event);
     passReleaseToDocument(event);
-    getPressedPos(event->pos());
-    m_item.showCurrentTextStyle();
+    if (tapPlacesCursor)
+        getPressedPos(event->pos());
+    m_styleEditor.showCurrentTextStyle();
     notifyTextPropertyAreaItemFocusState();
     m_longPressTimer.stop();
-    showOrHideHandleCaretAccordingCurPos();
+    if (ended == Gesture::DoubleTap)
+        m_state.handleCaret = false;
+    else
+        showOrHideHandleCaretAccordingCurPos();
     showOrHideSoftWare();
-    m_item.update();
+    m_surface.repaint();
 }
 
 // For a release on a widget Qt asks for the keyboard by itself, before caret and selection are where they
@@ -339,7 +306,7 @@ void TouchTextEditor::passReleaseToDocument(QGraphicsSceneMouseEvent* event)
 {
     QWidget* const widget = event->widget();
     event->setWidget(nullptr);
-    m_item.QGraphicsTextItem::mouseReleaseEvent(event);
+    m_surface.handleByTextItem(QEvent::GraphicsSceneMouseRelease, *event);
     event->setWidget(widget);
 }
 
@@ -350,149 +317,138 @@ void TouchTextEditor::cancelTouch()
     QGraphicsSceneMouseEvent release(QEvent::GraphicsSceneMouseRelease);
     release.setButton(Qt::LeftButton);
     release.setPos(m_state.pressPoint);
-    release.setScenePos(m_item.mapToScene(m_state.pressPoint));
-    m_item.QGraphicsTextItem::mouseReleaseEvent(&release);
-    if (m_item.getFocusFlag() == FocusObject && m_state.movedWhileSelected) {
-        m_item.placedItem()->setPos(m_state.placeAtPress);
-        m_state.positionChanged = false;
+    release.setScenePos(m_placement.mapToScene(m_state.pressPoint));
+    m_surface.handleByTextItem(QEvent::GraphicsSceneMouseRelease, release);
+    const Gesture ended = std::exchange(m_state.gesture, Gesture::None);
+    if (m_surface.getFocusFlag() == FocusObject && ended == Gesture::MoveObject) {
+        m_placement.setPlace(m_state.placeAtPress);
+        m_placement.clearMoved();
     }
-    m_state.pressed = false;
-    m_state.moved = false;
-    m_state.released = true;
-    m_state.selectionMoved = false;
-    m_state.handleMoving = false;
-    m_state.movedWhileSelected = false;
-    m_state.doubleClicked = false;
-    m_state.tapPlacesCursor = false;
-    m_item.parentFollows();
-    m_item.update();
+    m_surface.parentFollows();
+    m_surface.repaint();
 }
 
 void TouchTextEditor::enterEditMode()
 {
-    m_item.setFocusFlag(FocusEdit);
-    m_item.setTextInteractionFlags(Qt::TextEditorInteraction);
-    m_item.setFocus();
+    m_surface.setFocusFlag(FocusEdit);
+    m_surface.setWritable(true);
+    m_surface.takeFocus();
 }
 
-void TouchTextEditor::setBoundingRectLineStatus()
+bool TouchTextEditor::setBoundingRectLineStatus(Gesture ended)
 {
-    if (m_item.textInteractionFlags() == Qt::TextEditorInteraction) {
-        m_item.setFocusFlag(FocusEdit);
-        m_item.setFocus();
-        m_state.tapPlacesCursor = false;
-    } else if (m_state.movedWhileSelected) {
-        m_item.setFocusFlag(FocusObject);
-        m_state.movedWhileSelected = false;
-        m_state.handleCaret = false;
-        m_state.tapPlacesCursor = false;
-    } else if (m_item.getFocusFlag() == FocusNone) {
-        m_item.setFocusFlag(FocusObject);
-        m_item.styleEditor().showStyleOfWholeText();
-        m_state.pressCursor = -2;
-        m_state.handleCaret = false;
-        m_state.tapPlacesCursor = false;
+    bool tapPlacesCursor = false;
+    if (m_surface.isWritable()) {
+        m_surface.setFocusFlag(FocusEdit);
+        m_surface.takeFocus();
     } else {
-        m_state.tapPlacesCursor = true;
         m_state.handleCaret = false;
-        Q_EMIT m_item.signalGetSceneInputLanguage(&m_item);
-        enterEditMode();
-        m_item.showCurrentTextStyle();
+        if (ended == Gesture::MoveObject) {
+            m_surface.setFocusFlag(FocusObject);
+        } else if (m_surface.getFocusFlag() == FocusNone) {
+            m_surface.setFocusFlag(FocusObject);
+            m_styleEditor.showStyleOfWholeText();
+        } else {
+            tapPlacesCursor = true;
+            m_listener.editingBegins();
+            enterEditMode();
+            m_styleEditor.showCurrentTextStyle();
+        }
     }
-    m_item.parentFollows();
+    m_surface.parentFollows();
+    return tapPlacesCursor;
 }
 
 void TouchTextEditor::savePostionMoveUndoCommandWhenPositionChanged()
 {
-    if (!m_state.positionChanged)
+    if (!m_placement.isMoved())
         return;
-    m_state.positionChanged = false;
-    m_item.pushLastEditTextIntoStack();
-    TText& record = m_item.styles().current();
+    m_placement.clearMoved();
+    m_styleEditor.pushLastEditTextIntoStack();
+    TText& record = m_styles.current();
     const QPointF old(record.getXValue(), record.getYValue());
-    const QPointF now = m_item.scenePos();
+    const QPointF now = m_placement.textPlace();
     record.setXValue(float(now.x()));
     record.setYValue(float(now.y()));
-    Q_EMIT m_item.signalObjectPositionChanged(record.getTextObjectID(), old, now);
-    m_item.styleEditor().reportMovedObject();
+    m_listener.objectMoved(old, now);
+    m_styleEditor.reportMovedObject();
 }
 
 void TouchTextEditor::getPressedPos(QPointF point)
 {
-    if (!m_state.tapPlacesCursor || m_item.styles().isEmpty())
+    if (m_styles.isEmpty())
         return;
-    const QTextDocument& document = *m_item.document();
-    CaretGeometry& carets = m_item.textPainter().carets();
     const auto reaches = [&](const QTextBlock& block) {
-        return carets.heightAbove(block.blockNumber()) + block.layout()->boundingRect().height() >= point.y();
+        return m_carets.heightAbove(block.blockNumber()) + block.layout()->boundingRect().height() >=
+               point.y();
     };
-    QTextBlock tapped = document.begin();
+    QTextBlock tapped = m_document.begin();
     while (!reaches(tapped) && tapped.next().isValid())
         tapped = tapped.next();
     // Below the text the caret goes to the last line, in the column of the first.
     const bool below = !reaches(tapped);
-    const QTextBlock measured = below ? document.begin() : tapped;
+    const QTextBlock measured = below ? m_document.begin() : tapped;
     if (measured.layout()->lineCount() == 0)
         return;
-    const double inside = point.y() - carets.heightAbove(measured.blockNumber());
+    const double inside = point.y() - m_carets.heightAbove(measured.blockNumber());
     QTextLine line = measured.layout()->lineAt(0);
     for (int i = 1; !below && i < measured.layout()->lineCount() && line.y() + line.height() < inside; ++i)
         line = measured.layout()->lineAt(i);
     // What lies left of the line is taken off by the line itself.
-    putCursor(tapped.position() + line.xToCursor(point.x() - document.documentMargin() - CaretShift));
+    putCursor(tapped.position() + line.xToCursor(point.x() - m_document.documentMargin() - CaretShift));
 }
 
 bool TouchTextEditor::wholeTextSelected() const
 {
-    const QTextCursor cursor = m_item.textCursor();
-    const int count = m_item.styles().count();
+    const QTextCursor cursor = m_surface.selection();
+    const int count = m_styles.count();
     return count > 0 && cursor.selectionStart() == 0 && cursor.selectionEnd() >= count;
 }
 
 void TouchTextEditor::notifyTextPropertyAreaItemFocusState()
 {
-    if (m_item.getFocusFlag() == FocusObject)
-        Q_EMIT m_item.signalNotifyTextPropertyAreaObjectSelectionMode(true, true);
+    if (m_surface.getFocusFlag() == FocusObject)
+        m_listener.selectionModeChanged(true, true);
     else if (!wholeTextSelected())
-        Q_EMIT m_item.signalNotifyTextPropertyAreaObjectSelectionMode(false, false);
-    else if (m_item.getFocusFlag() == FocusEdit)
-        Q_EMIT m_item.signalNotifyTextPropertyAreaObjectSelectionMode(true, false);
+        m_listener.selectionModeChanged(false, false);
+    else if (m_surface.getFocusFlag() == FocusEdit)
+        m_listener.selectionModeChanged(true, false);
 }
 
 void TouchTextEditor::showOrHideHandleCaretAccordingCurPos()
 {
-    if (m_state.doubleClicked) {
-        m_state.doubleClicked = false;
-        m_state.handleCaret = false;
-        return;
-    }
-    QTextCursor cursor = m_item.textCursor();
-    if (cursor.hasSelection()) {
+    if (m_surface.selection().hasSelection()) {
         m_state.handleCaret = true;
         setPreviousAndCurrentCursorPos();
         return;
     }
     if (!m_state.handleCaret)
         return;
-    if (m_item.styles().isEmpty()) {
+    if (m_styles.isEmpty()) {
         m_state.handleCaret = false;
         return;
     }
-    // While handles show, at least one character stays selected.
+    keepOneCharacterSelected();
+}
+
+// While handles show, at least one character stays selected.
+void TouchTextEditor::keepOneCharacterSelected()
+{
+    QTextCursor cursor = m_surface.selection();
     const int position = cursor.position();
-    if (position == clampedPosition(m_item.styles().count()) ||
+    if (position == clampedPosition(m_styles.count()) ||
         (position != 0 && position == m_state.savedSelectionStart))
         cursor.movePosition(QTextCursor::Left, QTextCursor::KeepAnchor);
     else if (position == 0 || position == m_state.savedSelectionEnd)
         cursor.movePosition(QTextCursor::Right, QTextCursor::KeepAnchor);
-    m_item.setTextCursor(cursor);
-    m_item.showCurrentTextStyle();
+    m_surface.select(cursor);
+    m_styleEditor.showCurrentTextStyle();
     setPreviousAndCurrentCursorPos();
 }
 
 void TouchTextEditor::setPreviousAndCurrentCursorPos()
 {
-    const QTextCursor cursor = m_item.textCursor();
+    const QTextCursor cursor = m_surface.selection();
     m_state.previous.position = cursor.anchor();
     m_state.current.position = cursor.position();
 }
@@ -500,10 +456,10 @@ void TouchTextEditor::setPreviousAndCurrentCursorPos()
 void TouchTextEditor::showOrHideSoftWare()
 {
     const bool knowsSelection = m_state.keyboardAsked && selectionIsSaved();
-    if (m_item.getFocusFlag() == FocusEdit && !knowsSelection)
+    if (m_surface.getFocusFlag() == FocusEdit && !knowsSelection)
         requestKeyboard();
-    else if (m_item.getFocusFlag() == FocusObject)
-        Q_EMIT m_item.signalNotifySceneCurrentObjectInEditMode(nullptr);
+    else if (m_surface.getFocusFlag() == FocusObject)
+        m_listener.keyboardWanted(false);
 }
 
 // Double tap and long press
@@ -513,27 +469,26 @@ void TouchTextEditor::mouseDoubleClick(QGraphicsSceneMouseEvent* event)
     m_state.handleCaret = false;
     m_state.previous.position = -1;
     m_state.current.position = -1;
-    m_state.handleMoving = false;
     m_state.keyboardAsked = false;
-    m_state.doubleClicked = true;
-    m_item.setTextInteractionFlags(Qt::TextEditorInteraction);
-    m_item.QGraphicsTextItem::mouseDoubleClickEvent(event);
-    m_item.styleEditor().selectWholeText();
+    m_surface.setWritable(true);
+    m_surface.handleByTextItem(QEvent::GraphicsSceneMouseDoubleClick, *event);
+    m_state.gesture = Gesture::DoubleTap; // after Qt, which may have made a press of it
+    m_styleEditor.selectWholeText();
     m_state.doubleClickedSelection = true;
-    m_item.setTextInteractionFlags(Qt::TextEditorInteraction);
-    Q_EMIT m_item.signalNotifySceneCurrentMousePressedObjectId(m_item.getItemTText()->getTextObjectID());
-    m_item.update();
+    m_surface.setWritable(true);
+    m_listener.objectPressed();
+    m_surface.repaint();
 }
 
 void TouchTextEditor::setNearestCurPos()
 {
     TouchState::End caret;
-    QTextCursor cursor = m_item.textCursor();
-    if (!m_item.textPainter().carets().caretPoint(caret.line, caret.point, caret.block, cursor.position()))
+    QTextCursor cursor = m_surface.selection();
+    if (!m_carets.caretPoint(caret.line, caret.point, caret.block, cursor.position()))
         return;
     if (m_state.pressPoint.x() < caret.line.x1() && cursor.position() > 0) {
         cursor.movePosition(QTextCursor::Left);
-        m_item.setTextCursor(cursor);
+        m_surface.select(cursor);
     }
 }
 
@@ -547,11 +502,11 @@ int TouchTextEditor::getSelectionModel(const QTextCursor& word, int position)
 void TouchTextEditor::longPressed()
 {
     // Editing may have ended under the finger.
-    if (m_item.getFocusFlag() != FocusEdit || !m_item.isEnabled())
+    if (m_surface.getFocusFlag() != FocusEdit)
         return;
-    m_state.longPressed = true;
+    m_state.gesture = Gesture::LongPress;
     setNearestCurPos();
-    QTextCursor cursor = m_item.textCursor();
+    QTextCursor cursor = m_surface.selection();
     const int position = cursor.position();
     cursor.select(QTextCursor::WordUnderCursor);
     if (!cursor.hasSelection()) {
@@ -574,11 +529,11 @@ void TouchTextEditor::longPressed()
         cursor.movePosition(QTextCursor::Right, QTextCursor::KeepAnchor);
         break;
     }
-    m_item.setTextCursor(cursor);
+    m_surface.select(cursor);
     setPreviousAndCurrentCursorPos();
     m_state.handleCaret = true;
     requestKeyboardForSelection();
-    m_item.update();
+    m_surface.repaint();
 }
 
 // Keyboards
@@ -586,60 +541,38 @@ void TouchTextEditor::longPressed()
 void TouchTextEditor::keyPress(QKeyEvent* event)
 {
     m_state.doubleClickedSelection = false;
-    m_item.QGraphicsTextItem::keyPressEvent(event);
+    m_surface.handleByTextItem(QEvent::KeyPress, *event);
     switch (event->key()) {
     case Qt::Key_Left:
     case Qt::Key_Up:
     case Qt::Key_Right:
     case Qt::Key_Down:
-        m_item.showCurrentTextStyle();
+        m_styleEditor.showCurrentTextStyle();
         requestKeyboard();
         break;
     default:
         break;
     }
-    m_item.update();
-}
-
-void TouchTextEditor::keyboardClosed()
-{
-    LOG_DEBUG_OPERATE(L"Edit Area", 200, L"*****SoftKeyBoardClosed event is received*****");
-    // No later step may come between what was typed and the end of it.
-    m_item.pushLastEditTextIntoStack();
-    StyleDocument& styles = m_item.styles();
-    if (!(styles.undoBaseline() == styles.current())) {
-        TText before = styles.undoBaseline();
-        TText last = styles.lastAlpha();
-        Q_EMIT m_item.signalObjectContentsEdited(&before, &styles.current(), &last, &styles.lastAlpha());
-        styles.refreshUndoBaseline();
-    }
-    Q_EMIT m_item.signalSoftWareClosedWhenEditObject();
-    Q_EMIT m_item.signalSaveArchive(&m_item);
-    if (m_item.isBlank()) {
-        Q_EMIT m_item.signalNotifyIfExistSelectedObject(false);
-        Q_EMIT m_item.signalDeleteItem();
-    } else {
-        changeItemToSolidLineState();
-    }
+    m_surface.repaint();
 }
 
 void TouchTextEditor::setCursorPosition(int position)
 {
     m_state.doubleClickedSelection = false;
-    if (m_state.selectionMoved)
+    if (m_state.isSelecting())
         return;
-    m_item.setTextInteractionFlags(Qt::TextEditorInteraction);
+    m_surface.setWritable(true);
     putCursor(position);
 }
 
 void TouchTextEditor::selectionFromBeginToEnd(int begin, int end)
 {
     m_state.doubleClickedSelection = false;
-    if (m_state.selectionMoved)
+    if (m_state.isSelecting())
         return;
-    m_item.setTextInteractionFlags(Qt::TextEditorInteraction);
+    m_surface.setWritable(true);
     end = clampedPosition(end);
-    QTextCursor cursor = m_item.textCursor();
+    QTextCursor cursor = m_surface.selection();
     cursor.setPosition(clampedPosition(begin));
     const bool forward = end > cursor.position();
     const auto step = forward ? QTextCursor::Right : QTextCursor::Left;
@@ -647,7 +580,7 @@ void TouchTextEditor::selectionFromBeginToEnd(int begin, int end)
         if (!cursor.movePosition(step, QTextCursor::KeepAnchor))
             break;
     }
-    m_item.setTextCursor(cursor);
+    m_surface.select(cursor);
 }
 
 void TouchTextEditor::getSelectionInfo(int begin, int end, int current, int mode)
@@ -655,15 +588,16 @@ void TouchTextEditor::getSelectionInfo(int begin, int end, int current, int mode
     bool shadowAndAlign = false;
     switch (mode) {
     case 2:
-        m_item.styleEditor().selectWholeText();
+        m_styleEditor.selectWholeText();
         m_state.handleCaret = false;
         shadowAndAlign = true;
         break;
     case 1:
         m_state.handleCaret = true;
-        m_state.released = true;
+        if (m_state.gesture == Gesture::Press || m_state.gesture == Gesture::LongPress)
+            m_state.gesture = Gesture::None; // the finger holds no end of this selection
         selectionFromBeginToEnd(begin, end);
-        shadowAndAlign = wholeTextSelected() && m_item.getFocusFlag() == FocusEdit;
+        shadowAndAlign = wholeTextSelected() && m_surface.getFocusFlag() == FocusEdit;
         break;
     case 0:
         m_state.handleCaret = false;
@@ -673,33 +607,32 @@ void TouchTextEditor::getSelectionInfo(int begin, int end, int current, int mode
         break;
     }
     if (mode >= 0 && mode <= 2)
-        Q_EMIT m_item.signalNotifyTextPropertyAreaObjectSelectionMode(shadowAndAlign, false);
-    m_item.showCurrentTextStyle();
+        m_listener.selectionModeChanged(shadowAndAlign, false);
+    m_styleEditor.showCurrentTextStyle();
     setPreviousAndCurrentCursorPos();
-    m_item.update();
+    m_surface.repaint();
 }
 
 void TouchTextEditor::changeItemToSolidLineState()
 {
     m_longPressTimer.stop();
-    m_item.setFocusFlag(FocusObject);
+    m_surface.setFocusFlag(FocusObject);
     m_state.handleCaret = false;
-    m_item.styleEditor().showStyleOfWholeText();
-    m_item.clearFocus();
-    m_item.setTextInteractionFlags(Qt::NoTextInteraction);
-    m_state.pressCursor = -2;
-    m_item.parentFollows();
-    m_item.update();
-    Q_EMIT m_item.signalNotifyIfExistSelectedObject(true);
-    Q_EMIT m_item.signalNotifyTextPropertyAreaObjectSelectionMode(true, true);
+    m_styleEditor.showStyleOfWholeText();
+    m_surface.giveUpFocus();
+    m_surface.setWritable(false);
+    m_surface.parentFollows();
+    m_surface.repaint();
+    m_listener.objectSelected();
+    m_listener.selectionModeChanged(true, true);
 }
 
 void TouchTextEditor::initNewTextSelectAll()
 {
-    Q_EMIT m_item.signalGetSceneInputLanguage(&m_item);
+    m_listener.editingBegins();
     enterEditMode();
     requestKeyboard();
-    m_item.showCurrentTextStyle();
-    m_item.parentFollows();
-    m_item.update();
+    m_styleEditor.showCurrentTextStyle();
+    m_surface.parentFollows();
+    m_surface.repaint();
 }

@@ -1,30 +1,30 @@
 #pragma once
 
 #include "canvas/CaretPainter.h"
-#include "canvas/TextObjectConstants.h"
+#include "canvas/TextObjectParts.h"
 #include "canvas/TouchState.h"
 
 #include <QTimer>
 
-class GraphicsText;
 class QEvent;
 class QGraphicsSceneMouseEvent;
 class QKeyEvent;
 class QPainter;
 class QTextCursor;
+class TextStyleEditor;
 
 // What a finger and the soft keyboard do to a text object: the first tap selects it, a second edits it, a
-// drag moves it within limits, handles and long press select characters. GUI thread only.
-class TouchTextEditor : public TextObjectConstants
+// drag moves it within limits, handles and long press select characters. What the finger does is one
+// TouchState::Gesture, which press, move and release decide in turn. GUI thread only.
+class TouchTextEditor
 {
 public:
-    explicit TouchTextEditor(GraphicsText& item);
+    // The style editor is that of the same object.
+    TouchTextEditor(const TextObjectParts& parts, TextStyleEditor& styleEditor);
 
     bool isHandleCaret() const { return m_state.handleCaret; }
     bool isDoubleClickedSelection() const { return m_state.doubleClickedSelection; }
     void clearHandleCaret() { m_state.handleCaret = false; }
-    void markPositionChanged() { m_state.positionChanged = true; }
-    void clearPositionChanged() { m_state.positionChanged = false; }
 
     void mousePress(QGraphicsSceneMouseEvent* event);
     void mouseMove(QGraphicsSceneMouseEvent* event);
@@ -33,21 +33,15 @@ public:
     // The press ends without a release.
     void cancelTouch();
     void keyPress(QKeyEvent* event);
+    // Its timeout has to call longPressed().
+    const QTimer& longPressTimer() const { return m_longPressTimer; }
     void longPressed();
     // True swallows the event.
     bool filter(QEvent* event);
 
-    // The keyboard was closed by the operator.
-    void keyboardClosed();
     void getSelectionInfo(int begin, int end, int current, int mode);
     void initNewTextSelectAll();
     void changeItemToSolidLineState();
-
-    // Side over which an object placed at the point (scene coordinates) would leave the canvas: 1 left, 2
-    // right, 3 top, 4 bottom, 0 none.
-    int itemIsOutOfRange(QPointF position) const;
-    // Places the object at the limit of that side.
-    void adjustItemPos(int side);
 
     void paintBelowGlyphs(QPainter* painter) { m_caretPainter.paintSelectionWhenContinueSelect(painter); }
     void paintAboveGlyphs(QPainter* painter) { m_caretPainter.paintCaretAndHandles(painter); }
@@ -61,17 +55,20 @@ private:
     void exchangeValueofCurrentAndPreviousCursor();
     void adjustMousePressedPos(QGraphicsSceneMouseEvent* event, HandleHit hit);
     void moveUpEventPosWhenHasHandleCaret(QGraphicsSceneMouseEvent* event) const;
-    void resetItemPos();
+    void dragObject(QGraphicsSceneMouseEvent* event);
+    void dragSelection(QGraphicsSceneMouseEvent* event);
     void synchronizeKeyBoardCursorPos();
     void makeMouseMoveYPosInsideTextObject(QGraphicsSceneMouseEvent* event) const;
     bool filterDrag(const QGraphicsSceneMouseEvent& event);
-    void setBoundingRectLineStatus();
+    // Returns whether the object is edited from now on, so that the tap places the cursor.
+    bool setBoundingRectLineStatus(TouchState::Gesture ended);
     void enterEditMode();
     void savePostionMoveUndoCommandWhenPositionChanged();
     void getPressedPos(QPointF point);
     void notifyTextPropertyAreaItemFocusState();
     bool wholeTextSelected() const;
     void showOrHideHandleCaretAccordingCurPos();
+    void keepOneCharacterSelected();
     void setPreviousAndCurrentCursorPos();
     void showOrHideSoftWare();
     void setNearestCurPos();
@@ -85,7 +82,13 @@ private:
     void putCursor(int position);
     void requestKeyboard();
 
-    GraphicsText& m_item;
+    QTextDocument& m_document;
+    StyleDocument& m_styles;
+    CaretGeometry& m_carets;
+    TextPlacement& m_placement;
+    ITextSurface& m_surface;
+    ITextObjectListener& m_listener;
+    TextStyleEditor& m_styleEditor;
     TouchState m_state;
     CaretPainter m_caretPainter;
     QTimer m_longPressTimer;

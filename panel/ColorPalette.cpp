@@ -205,6 +205,7 @@ void ColorPalette::closePalette()
 
 void ColorPalette::resizeEvent(QResizeEvent* event)
 {
+    m_separator = QPixmap(QStringLiteral(":/Separator_H"));
     m_background = DrawBoundingRectangle().paintBoundingRectangle(BACKGROUND_KIND);
     QDialog::resizeEvent(event);
 }
@@ -222,7 +223,7 @@ void ColorPalette::paintEvent(QPaintEvent*)
 
 void ColorPalette::drawHorizontalLine(QPainter& painter, const QRect& line) const
 {
-    painter.drawPixmap(line, QPixmap(QStringLiteral(":/Separator_H")));
+    painter.drawPixmap(line, m_separator);
 }
 
 void ColorPalette::drawFocusBoundingRect(QPainter& painter) const

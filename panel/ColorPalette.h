@@ -106,4 +106,5 @@ private:
     QString m_pressedObjectName;
     QPixmap m_background;
     DialogMasks m_masks{this, QMargins(), DialogMasks::Press::EndsHere};
+    QPixmap m_separator;
 };

@@ -110,7 +110,8 @@ void SizeToolBox::setFontSize(const QList<int>& sizes)
 {
     if (sizes.isEmpty())
         return;
-    const bool wasEditing = std::exchange(m_editMark, false);
+    const bool wasEditing = isEditing();
+    m_state = State::Shown;
     m_sizes = sizes;
     showText(SizeLadder::displayText(sizes));
     updateButtons();
@@ -121,12 +122,11 @@ void SizeToolBox::setFontSize(const QList<int>& sizes)
 
 void SizeToolBox::showText(const QString& text)
 {
-    m_ignoreNext = 1;
+    const State before = std::exchange(m_state, State::Writing);
     Q_EMIT setComboxIndex(m_box->findData(text, Qt::DisplayRole));
     if (m_edit->text() != text)
         m_box->setEditText(text);
-    m_ignoreNext = 0;
-    m_valid = true;
+    m_state = before == State::Invalid ? State::Valid : before;
 }
 
 void SizeToolBox::updateButtons()
@@ -171,9 +171,10 @@ void SizeToolBox::translateText()
 
 void SizeToolBox::fontSizeChanged(const QString& text)
 {
-    if (m_ignoreNext != 0)
+    if (m_state == State::Writing)
         return;
-    const bool wasEditing = std::exchange(m_editMark, false);
+    const bool wasEditing = isEditing();
+    m_state = State::Shown;
     bool isNumber = false;
     const int size = text.toInt(&isNumber);
     if (isNumber)
@@ -222,7 +223,7 @@ bool SizeToolBox::eventFilter(QObject* object, QEvent* event)
     switch (static_cast<int>(event->type())) {
     case QEvent::KeyPress: {
         const int key = static_cast<QKeyEvent*>(event)->key();
-        if (!m_editMark || (key != Qt::Key_Return && key != Qt::Key_Enter))
+        if (!isEditing() || (key != Qt::Key_Return && key != Qt::Key_Enter))
             return false;
         enterPressed();
         return true;
@@ -257,14 +258,13 @@ bool SizeToolBox::doLineEditEvent(QEvent* event)
     case QEvent::MouseButtonDblClick:
         if (!isBoxEnabled())
             return true;
-        if (m_editMark) {
+        if (isEditing()) {
             m_edit->selectAll();
             return true;
         }
         setFocusForLineEdit();
         m_lastValidText = m_edit->text();
-        m_valid = true;
-        m_editMark = true;
+        m_state = State::Valid;
         return false;
     default:
         return false;
@@ -273,17 +273,20 @@ bool SizeToolBox::doLineEditEvent(QEvent* event)
 
 bool SizeToolBox::onTouchEvent(const QTouchEvent* event)
 {
-    const bool wasEditing = m_editMark;
+    const bool wasEditing = isEditing();
     switch (m_finger->follow(event)) {
     case OneFinger::Step::Begin:
         sendMouseToLineEdit(QEvent::MouseButtonPress, m_finger->positionIn(m_edit));
-        m_touchBeganEditing = m_editMark && !wasEditing;
+        if (!wasEditing && m_state == State::Valid)
+            m_state = State::Touched;
         break;
     case OneFinger::Step::Move:
         sendMouseToLineEdit(QEvent::MouseMove, m_finger->positionIn(m_edit));
         break;
     case OneFinger::Step::End:
         sendMouseToLineEdit(QEvent::MouseButtonRelease, m_finger->positionIn(m_edit));
+        if (m_state == State::Touched)
+            m_state = State::Valid;
         break;
     case OneFinger::Step::None:
         break;
@@ -303,7 +306,7 @@ void SizeToolBox::sendMouseToLineEdit(QEvent::Type type, const QPointF& position
 void SizeToolBox::letGoOfLineEdit()
 {
     sendMouseToLineEdit(QEvent::MouseButtonRelease, QPointF(-1, -1));
-    clearFocusOfSizeBoxLineEdit(m_touchBeganEditing);
+    clearFocusOfSizeBoxLineEdit(m_state == State::Touched);
 }
 
 void SizeToolBox::setFocusForLineEdit()
@@ -315,17 +318,20 @@ void SizeToolBox::setFocusForLineEdit()
 
 void SizeToolBox::setValid(bool valid)
 {
-    if (m_ignoreNext != 0)
+    if (!isEditing())
         return;
-    m_valid = valid;
+    if (!valid)
+        m_state = State::Invalid;
+    else if (m_state == State::Invalid)
+        m_state = State::Valid;
     KSInputContext* input = KSInputContext::instance();
-    if (valid && m_editMark && input)
+    if (valid && input)
         input->showLimitInfo(SubCommonDefine::taLimitInfo());
 }
 
 void SizeToolBox::enterPressed()
 {
-    if (m_valid && m_edit->hasAcceptableInput()) {
+    if (m_state != State::Invalid && m_edit->hasAcceptableInput()) {
         Q_EMIT validEditingText();
     } else {
         resetLastValidTextAndShowWarning();
@@ -344,12 +350,13 @@ void SizeToolBox::editSizeFinished()
 // The field was left by another way than Enter: what is not a size is refused aloud, the rest is dropped.
 void SizeToolBox::editingLeft()
 {
-    if (!m_editMark)
+    if (!isEditing())
         return;
-    m_editMark = false;
     // What was typed on the keyboard is only in the verdict about it; the question about the field overwrites
     // that.
-    if (m_valid && m_edit->hasAcceptableInput()) {
+    const bool wasValid = m_state != State::Invalid;
+    m_state = State::Shown;
+    if (wasValid && m_edit->hasAcceptableInput()) {
         showText(m_lastValidText);
     } else {
         resetLastValidTextAndShowWarning();
@@ -375,7 +382,7 @@ void SizeToolBox::showWarningMessage()
 
 void SizeToolBox::clearFocusOfSizeBoxLineEdit(bool clear)
 {
-    if (!clear || !m_editMark)
+    if (!clear || !isEditing())
         return;
     showText(m_lastValidText);
     leaveEditing();
@@ -392,7 +399,7 @@ void SizeToolBox::closeKeyboard() const
 
 void SizeToolBox::leaveEditing()
 {
-    m_editMark = false;
+    m_state = State::Shown;
     m_edit->deselect();
     closeKeyboard();
     m_edit->setReadOnly(true);

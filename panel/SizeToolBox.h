@@ -48,7 +48,7 @@ public:
     void clearFocusOfSizeBoxLineEdit(bool clear);
     // The validator's verdict on what is being typed.
     void setValid(bool valid);
-    bool isEditing() const { return m_editMark; }
+    bool isEditing() const { return m_state != State::Shown && m_state != State::Writing; }
     void hideComboxList();
 
     void setWidgetEnabled() override;
@@ -70,6 +70,15 @@ Q_SIGNALS:
     void validEditingText();
 
 private:
+    // What the field does now.
+    enum class State {
+        Shown,   // it shows the size of what is selected
+        Writing, // it is being written from code
+        Touched, // it is typed into, since the touch that is still on it
+        Valid,   // it is typed into, and holds a size
+        Invalid  // it is typed into, and holds no size
+    };
+
     void createBox();
     void fontSizeChanged(const QString& text);
     void fontSizeToNext();
@@ -97,13 +106,10 @@ private:
     KSCombobox* m_box = nullptr;
     SizeBoxLineEdit* m_edit = nullptr;
     std::unique_ptr<OneFinger> m_finger; // on the field
-    bool m_touchBeganEditing = false;
     QLabel* m_ptLabel = nullptr;
     KSPushbutton* m_previous = nullptr;
     KSPushbutton* m_next = nullptr;
     QList<int> m_sizes{DEFAULT_SIZE};
-    int m_ignoreNext = 0; // the box is being written from code
-    bool m_valid = true;
+    State m_state = State::Shown;
     QString m_lastValidText;
-    bool m_editMark = false;
 };

@@ -1,6 +1,6 @@
-// Building, layout and wiring of the panel, and what is only passed on.
 #include "panel/TextToolsPanel.h"
 
+#include "canvas/TextObjectConstants.h"
 #include "panel/AlignToolBox.h"
 #include "panel/BoldToolBox.h"
 #include "panel/ColorPalette.h"
@@ -12,24 +12,19 @@
 #include "panel/ShadowToolBox.h"
 #include "panel/SizeToolBox.h"
 #include "panel/TextColorToolBox.h"
-#include "touchui/NewLayout.h"
-
-#include <QHBoxLayout>
-#include <QVBoxLayout>
+#include "panel/TextToolsLog.h"
 
 #include <utility>
 
 const QString TextToolsPanel::EMPTY;
 const QString TextToolsPanel::USELESS_STR;
 const QString TextToolsPanel::FONT_DEFAULT_COLOR = QStringLiteral("#FFFFFF");
-const QString TextToolsPanel::SHADOW_DEFAULT_COLOR = QStringLiteral("#000000");
+const QString TextToolsPanel::SHADOW_DEFAULT_COLOR = QString::fromLatin1(WorkingStyle::SHADOW_COLOR);
 
 namespace
 {
 
-constexpr int BOLD_ROW_SPACING = 24;
-constexpr int LEFT_MARGIN = 40; // the panel begins under the tools bar, left of the window's separator
-constexpr int BLOCK_SPACING = 60;
+constexpr int COMMITTED = TextObjectConstants::CommittedChange;
 const char DEFAULT_FAMILY[] = "KST";
 const char CHINESE_FAMILY[] = "DFHeiW5-A";
 
@@ -50,145 +45,54 @@ QString familyOf(SystemSetupDef::emInformationModel model, SystemSetupDef::emInp
     }
 }
 
-QHBoxLayout* newRow(const QList<QWidget*>& widgets)
-{
-    auto* row = newLayout<QHBoxLayout>(TextToolsPanel::TEXTTOOL_LAYOUT_SPACING);
-    for (QWidget* widget : widgets)
-        row->addWidget(widget);
-    row->addStretch();
-    return row;
-}
-
 } // namespace
 
 TextToolsPanel::TextToolsPanel(QWidget* parent)
-    : QWidget(parent), m_defaultFamily(QString::fromLatin1(DEFAULT_FAMILY))
+    : QWidget(parent), m_boxes(this), m_palette(this), m_defaultFamily(QString::fromLatin1(DEFAULT_FAMILY))
 {
     setFocusPolicy(Qt::NoFocus);
-    createToolBoxes();
-    createLayout();
+    setLayout(m_boxes.createLayout());
     createConnection();
     initTextToolsPanel();
 }
 
 TextToolsPanel::~TextToolsPanel() = default;
 
-void TextToolsPanel::createToolBoxes()
-{
-    m_family = new FamilyToolBox(this);
-    m_size = new SizeToolBox(this);
-    m_bold = new BoldToolBox(this);
-    m_italic = new ItalicToolBox(this);
-    m_edge = new EdgeToolBox(this);
-    m_shadow = new ShadowToolBox(this);
-    m_align = new AlignToolBox(this);
-    m_kerning = new KerningToolBox(this);
-    m_textColor = new TextColorToolBox(this);
-    m_move = new RangeOfMoveText(this);
-    m_palette = new ColorPalette(this);
-}
-
-QList<ToolBox*> TextToolsPanel::boxes() const
-{
-    return {m_family, m_size, m_bold, m_italic, m_edge, m_shadow, m_align, m_kerning, m_textColor, m_move};
-}
-
-void TextToolsPanel::createLayout()
-{
-    auto* row = newLayout<QHBoxLayout>(TextToolsPanel::TEXTTOOL_LAYOUT_SPACING);
-    row->addSpacing(LEFT_MARGIN);
-    row->addLayout(createLeftBlock());
-    row->addSpacing(BLOCK_SPACING);
-    row->addLayout(createMiddleBlock());
-    row->addSpacing(BLOCK_SPACING);
-    row->addWidget(m_move);
-    row->addStretch();
-    setLayout(row);
-}
-
-QLayout* TextToolsPanel::createLeftBlock()
-{
-    auto* block = newLayout<QVBoxLayout>(TEXTTOOL_LAYOUT_SPACING);
-    block->addLayout(newRow({m_family, m_textColor}));
-    block->addSpacing(ROW_SPACING);
-    block->addLayout(newRow({m_size}));
-    block->addSpacing(BOLD_ROW_SPACING);
-    block->addLayout(newRow({m_bold, m_italic}));
-    block->addStretch();
-    return block;
-}
-
-QLayout* TextToolsPanel::createMiddleBlock()
-{
-    auto* block = newLayout<QVBoxLayout>(TEXTTOOL_LAYOUT_SPACING);
-    block->addLayout(newRow({m_edge}));
-    block->addSpacing(ROW_SPACING);
-    block->addLayout(newRow({m_shadow}));
-    block->addSpacing(BOLD_ROW_SPACING);
-    block->addLayout(newRow({m_kerning, m_align}));
-    block->addStretch();
-    return block;
-}
-
 void TextToolsPanel::createConnection()
 {
-    connect(m_family, &FamilyToolBox::familyChange, this, &TextToolsPanel::changeFamily);
-    connect(m_size, &SizeToolBox::sizeChange, this, &TextToolsPanel::changeSize);
-    connect(m_bold, &BoldToolBox::boldChange, this, &TextToolsPanel::changeBold);
-    connect(m_italic, &ItalicToolBox::italicChange, this, &TextToolsPanel::changeItalic);
-    connect(m_textColor, &TextColorToolBox::textColorChange, this, &TextToolsPanel::changeTextColor);
-    connect(m_edge, &EdgeToolBox::edgeChange, this, &TextToolsPanel::changeEdge);
-    connect(m_align, &AlignToolBox::alignChange, this, &TextToolsPanel::changeAlign);
-    connect(m_kerning, &KerningToolBox::kerningChange, this, &TextToolsPanel::changeKerning);
-    connect(m_shadow, &ShadowToolBox::shadowChange, this, &TextToolsPanel::changeShadow);
-    connect(m_move, &RangeOfMoveText::moveRangeChanged, this, &TextToolsPanel::changeMoveRange);
+    connect(m_boxes.family, &FamilyToolBox::familyChange, this, &TextToolsPanel::changeFamily);
+    connect(m_boxes.size, &SizeToolBox::sizeChange, this, &TextToolsPanel::changeSize);
+    connect(m_boxes.bold, &BoldToolBox::boldChange, this, &TextToolsPanel::changeBold);
+    connect(m_boxes.italic, &ItalicToolBox::italicChange, this, &TextToolsPanel::changeItalic);
+    connect(m_boxes.textColor, &TextColorToolBox::textColorChange, this, &TextToolsPanel::changeTextColor);
+    connect(m_boxes.edge, &EdgeToolBox::edgeChange, this, &TextToolsPanel::changeEdge);
+    connect(m_boxes.align, &AlignToolBox::alignChange, this, &TextToolsPanel::changeAlign);
+    connect(m_boxes.kerning, &KerningToolBox::kerningChange, this, &TextToolsPanel::changeKerning);
+    connect(m_boxes.shadow, &ShadowToolBox::shadowChange, this, &TextToolsPanel::changeShadow);
+    connect(m_boxes.move, &RangeOfMoveText::moveRangeChanged, this, &TextToolsPanel::changeMoveRange);
 
-    connect(m_textColor, &TextColorToolBox::clicked, this, &TextToolsPanel::showFontColorPalette);
-    connect(m_edge, &EdgeToolBox::clicked, this, &TextToolsPanel::showEdgeColorPalette);
-    connect(m_palette, &ColorPalette::sendColorValue, this, &TextToolsPanel::getColorValue);
-    connect(this, &TextToolsPanel::sendTitlerWindowRect, m_palette, &ColorPalette::setTitlerWindowRect);
+    connect(m_boxes.textColor, &TextColorToolBox::clicked, this, &TextToolsPanel::showFontColorPalette);
+    connect(m_boxes.edge, &EdgeToolBox::clicked, this, &TextToolsPanel::showEdgeColorPalette);
+    connect(m_palette.widget(), &ColorPalette::sendColorValue, this, &TextToolsPanel::getColorValue);
+    connect(this, &TextToolsPanel::sendTitlerWindowRect, m_palette.widget(),
+            &ColorPalette::setTitlerWindowRect);
 
-    connect(m_size, &SizeToolBox::signalSizeToolBoxEditDone, this,
+    connect(m_boxes.size, &SizeToolBox::signalSizeToolBoxEditDone, this,
             &TextToolsPanel::signalNotifyEditAreaSizeToolBoxEditDone);
-    connect(m_size, &SizeToolBox::signalShowSizeComboxList, this,
+    connect(m_boxes.size, &SizeToolBox::signalShowSizeComboxList, this,
             &TextToolsPanel::signalShowFontSizeComboxList);
-    connect(m_family, &FamilyToolBox::signalShowComboxList, this,
+    connect(m_boxes.family, &FamilyToolBox::signalShowComboxList, this,
             &TextToolsPanel::slotShowFontFamilyComboxList);
-    connect(m_edge, &EdgeToolBox::signalShowEdgeSlider, this, &TextToolsPanel::signalShowEdgeSlider);
-    for (const ToolBox* box : boxes()) {
+    connect(m_boxes.edge, &EdgeToolBox::signalShowEdgeSlider, this, &TextToolsPanel::signalShowEdgeSlider);
+    for (const ToolBox* box : m_boxes.all()) {
         connect(box, &ToolBox::signalClearSizeBoxLineEditFocus, this,
                 &TextToolsPanel::slotClearSizeBoxLineEditFocus);
     }
 }
 
-// Index is the shadow style.
-const QList<TShadow>& TextToolsPanel::initConstShadowValue()
-{
-    static const QList<TShadow> table = [] {
-        const QPoint directions[] = {{0, 0}, {RIGHT_X, DOWN_Y}, {0, DOWN_Y}, {LEFT_X, DOWN_Y}};
-        QList<TShadow> shadows;
-        for (const QPoint& direction : directions) {
-            TShadow shadow;
-            shadow.setShadowColor(SHADOW_DEFAULT_COLOR.toStdString());
-            shadow.setShadowDirectionX(direction.x());
-            shadow.setShadowDirectionY(direction.y());
-            shadows.append(shadow);
-        }
-        return shadows;
-    }();
-    return table;
-}
-
-// Percent of the font's own spacing; index is the level.
-const QList<int>& TextToolsPanel::initConstKerningValue()
-{
-    static const QList<int> table{80, 90, 100, 110, 120};
-    return table;
-}
-
 void TextToolsPanel::setSignalValue(bool enabled)
 {
-    m_enabledForChange = enabled ? 1 : 0;
+    m_changesPass = enabled;
 }
 
 void TextToolsPanel::setModuleInfo(SystemSetupDef::emInformationModel model)
@@ -202,50 +106,50 @@ void TextToolsPanel::setModuleInfo(SystemSetupDef::emInformationModel model)
 void TextToolsPanel::displayInputLanguage(SystemSetupDef::emInputLanguageType language)
 {
     const QString before = std::exchange(m_defaultFamily, familyOf(m_model, language));
-    if (m_defaultFamily != before && !m_family->isBoxEnabled())
-        m_family->setFontFamily(m_defaultFamily);
+    if (m_defaultFamily != before && !m_boxes.family->isBoxEnabled())
+        m_boxes.family->setFontFamily(m_defaultFamily);
 }
 
 void TextToolsPanel::translateText()
 {
-    for (ToolBox* box : boxes())
+    for (ToolBox* box : m_boxes.all())
         box->translateText();
-    m_palette->translateText();
+    m_palette.widget()->translateText();
 }
 
 bool TextToolsPanel::colorPaletteIsShown() const
 {
-    return m_palette->isVisible();
+    return m_palette.widget()->isVisible();
 }
 
 void TextToolsPanel::showDialogMaskWidget(bool show)
 {
-    m_palette->showDialogMask(show);
+    m_palette.widget()->showDialogMask(show);
 }
 
 void TextToolsPanel::showMessageMaskWidget(bool show)
 {
-    m_palette->showMessageMask(show);
+    m_palette.widget()->showMessageMask(show);
 }
 
 bool TextToolsPanel::edgeSliderIsShown() const
 {
-    return m_edge->sliderIsShown();
+    return m_boxes.edge->sliderIsShown();
 }
 
 void TextToolsPanel::hideEdgeSlider()
 {
-    m_edge->hideEdgeSliderMenu();
+    m_boxes.edge->hideEdgeSliderMenu();
 }
 
 void TextToolsPanel::hideFontFamilyComboxList()
 {
-    m_family->hideComboxList();
+    m_boxes.family->hideComboxList();
 }
 
 void TextToolsPanel::hideFontSizeComboxList()
 {
-    m_size->hideComboxList();
+    m_boxes.size->hideComboxList();
 }
 
 void TextToolsPanel::titlerWindowRectSlot(QRect rect)
@@ -256,33 +160,33 @@ void TextToolsPanel::titlerWindowRectSlot(QRect rect)
 
 void TextToolsPanel::slotImportNewFontFamlies(QString file)
 {
-    m_family->importFontFamilyNotify(file);
+    m_boxes.family->importFontFamilyNotify(file);
 }
 
 void TextToolsPanel::modifyFontFamilyComboxItem(bool isAllItems)
 {
-    m_family->modifyComboxItem(isAllItems);
+    m_boxes.family->modifyComboxItem(isAllItems);
 }
 
 void TextToolsPanel::slotCanvasSceneMouseTouched()
 {
-    m_edge->hideEdgeSliderMenu();
+    m_boxes.edge->hideEdgeSliderMenu();
 }
 
 void TextToolsPanel::slotHideColorPaletteWhenCloseSoftWare()
 {
-    m_palette->reject();
+    m_palette.cancel();
 }
 
 void TextToolsPanel::slotEndPreview()
 {
-    m_palette->reject();
+    m_palette.cancel();
     hideEdgeSlider();
 }
 
 void TextToolsPanel::slotClearSizeBoxLineEditFocus(bool clear)
 {
-    m_size->clearFocusOfSizeBoxLineEdit(clear);
+    m_boxes.size->clearFocusOfSizeBoxLineEdit(clear);
 }
 
 void TextToolsPanel::slotShowFontFamilyComboxList(bool shown)
@@ -292,5 +196,219 @@ void TextToolsPanel::slotShowFontFamilyComboxList(bool shown)
 
 void TextToolsPanel::slotAbsoluteShowCanvasMenu(bool shown)
 {
-    m_size->clearFocusOfSizeBoxLineEdit(shown);
+    m_boxes.size->clearFocusOfSizeBoxLineEdit(shown);
+}
+
+// The change path: what the operator does in a tool box goes into the working copy and to the canvas
+
+// Every change goes this way. An empty log line is left out. The copy lives during the call only, so that
+// whoever shows the answer may replace the working copy meanwhile.
+template <typename Edit>
+void TextToolsPanel::change(const std::wstring& log, int id, int undoFlag, Edit edit)
+{
+    if (!m_style.record())
+        return;
+    m_palette.cancelUnlessAnswering();
+    TextToolsLog::write(log);
+    if (!m_changesPass)
+        return;
+    edit();
+    TText copy(*m_style.record());
+    Q_EMIT textStyleChange(&copy, id, undoFlag);
+    // What the next run starts with.
+    if (undoFlag == COMMITTED && id != TextObjectConstants::PropertyPosition && m_style.record() &&
+        !m_style.record()->textItems().empty())
+        m_controller.setLastTextStyle(m_style.fontStyle());
+}
+
+void TextToolsPanel::changeFamily(QString family, int id)
+{
+    change(TextToolsLog::family(family), id, COMMITTED, [&] { m_style.setFamily(family); });
+}
+
+void TextToolsPanel::changeSize(QList<int> sizes, int id)
+{
+    if (!sizes.isEmpty())
+        change(TextToolsLog::size(sizes.constLast()), id, COMMITTED, [&] { m_style.setSizes(sizes); });
+}
+
+void TextToolsPanel::changeBold(int bold, int id)
+{
+    change(TextToolsLog::bold(bold), id, COMMITTED, [&] { m_style.setBold(bold); });
+}
+
+void TextToolsPanel::changeItalic(int italic, int id)
+{
+    change(TextToolsLog::italic(italic), id, COMMITTED, [&] { m_style.setItalic(italic); });
+}
+
+void TextToolsPanel::changeTextColor(QString color, int id, int state)
+{
+    change(TextToolsLog::color(color), id, state, [&] {
+        if (state == ColorPalette::CANCEL)
+            m_style.setColors(m_palette.savedColors());
+        else
+            m_style.setColor(color);
+    });
+}
+
+void TextToolsPanel::changeEdge(int on, TEdge edge, int id, int undoFlag, int kind)
+{
+    change(TextToolsLog::edge(on, edge, undoFlag, kind), id, undoFlag, [&] {
+        m_edgePreview = id == TextObjectConstants::PropertyEdgeWidthPreview;
+        editEdge(on, edge, undoFlag, kind);
+    });
+    m_edgePreview = false;
+}
+
+// Characters keep the values of their edge that the change is not about.
+void TextToolsPanel::editEdge(int on, const TEdge& edge, int undoFlag, int kind)
+{
+    if (undoFlag == ColorPalette::CANCEL) {
+        m_style.setEdgeColors(m_palette.savedColors());
+        return;
+    }
+    switch (kind) {
+    case EdgeToolBox::SWITCH:
+        m_style.setEdge(on);
+        break;
+    case EdgeToolBox::WIDTH:
+        m_style.setEdgeWidth(edge.getEdgeWidth());
+        break;
+    case EdgeToolBox::COLOR:
+        m_style.setEdgeColor(QString::fromStdString(edge.getEdgeColor()));
+        break;
+    default:
+        break;
+    }
+}
+
+void TextToolsPanel::changeShadow(int style, int id)
+{
+    if (style < 0 || style >= WorkingStyle::shadows().size())
+        return;
+    change(TextToolsLog::shadow(), id, COMMITTED, [&] {
+        m_style.setShadow(style);
+        m_boxes.setShadowOffsets(WorkingStyle::shadows().at(style));
+    });
+}
+
+void TextToolsPanel::changeAlign(int align, int id)
+{
+    change(TextToolsLog::align(), id, COMMITTED, [&] { m_style.setAlign(align); });
+}
+
+void TextToolsPanel::changeKerning(int index, int id)
+{
+    const QList<int>& kernings = WorkingStyle::kernings();
+    if (index < KerningToolBox::DOUBLESMALL || index >= kernings.size())
+        return;
+    change(TextToolsLog::kerning(), id, COMMITTED, [&] { m_style.setKerning(kernings.at(index)); });
+}
+
+void TextToolsPanel::changeMoveRange(int range, int direction, int id)
+{
+    const float distance = float(range);
+    change(TextToolsLog::move(range, direction), id, COMMITTED, [&] {
+        switch (direction) {
+        case RangeOfMoveText::UPBUTTON_INDEX:
+            m_style.moveBy(0.0F, -distance);
+            break;
+        case RangeOfMoveText::RIGHTBUTTON_INDEX:
+            m_style.moveBy(distance, 0.0F);
+            break;
+        case RangeOfMoveText::DOWNBUTTON_INDEX:
+            m_style.moveBy(0.0F, distance);
+            break;
+        default:
+            m_style.moveBy(-distance, 0.0F);
+            break;
+        }
+    });
+}
+
+// The palette
+
+void TextToolsPanel::showFontColorPalette()
+{
+    showPalette(PanelPalette::TEXT_COLOR_OWNER, m_boxes.textColor->getColor());
+}
+
+void TextToolsPanel::showEdgeColorPalette()
+{
+    showPalette(PanelPalette::EDGE_COLOR_OWNER, m_boxes.edge->getColor());
+}
+
+void TextToolsPanel::showPalette(PanelPalette::Owner owner, const QString& color)
+{
+    m_boxes.size->clearFocusOfSizeBoxLineEdit(true);
+    if (!m_palette.open(owner, color, m_titlerWindowRect.topLeft()))
+        return;
+    m_palette.setSavedColors(owner == PanelPalette::EDGE_COLOR_OWNER ? m_style.edgeColors()
+                                                                     : m_style.colors());
+}
+
+void TextToolsPanel::getColorValue(QString color, int state)
+{
+    const PanelPalette::Answer answer(m_palette);
+    switch (m_palette.owner()) {
+    case PanelPalette::TEXT_COLOR_OWNER:
+        m_boxes.textColor->getColorValue(color, state);
+        break;
+    case PanelPalette::EDGE_COLOR_OWNER:
+        m_boxes.edge->getColorValue(color, state);
+        break;
+    case PanelPalette::NO_OWNER:
+        break;
+    }
+}
+
+// The reverse path: what is selected on the canvas is shown in the tool boxes, and nothing is sent back
+
+void TextToolsPanel::updateTextStyle(TText* style)
+{
+    if (!style || style->textItems().empty())
+        return;
+    m_palette.cancelUnlessAnswering();
+    m_changesPass = false;
+    m_style.set(*style);
+    m_boxes.show(*m_style.record(), m_edgePreview);
+    m_boxes.enable();
+    m_changesPass = true;
+}
+
+void TextToolsPanel::changeFontPropertyBtnStatus(bool enabled)
+{
+    if (enabled) {
+        m_boxes.enable();
+    } else {
+        m_palette.cancel();
+        m_boxes.disable();
+    }
+}
+
+void TextToolsPanel::selectionModeForShadowAndAlign(bool shadowAlign, bool move)
+{
+    m_boxes.allow(shadowAlign, move);
+}
+
+void TextToolsPanel::initTextToolsPanel()
+{
+    slotEndPreview();
+    hideFontFamilyComboxList();
+    hideFontSizeComboxList();
+    m_boxes.size->clearFocusOfSizeBoxLineEdit(true);
+    m_changesPass = false;
+    m_style.clear();
+    m_palette.forget();
+    m_boxes.reset();
+    m_boxes.show(m_controller.getLastTextStyle());
+    m_boxes.disable();
+}
+
+void TextToolsPanel::slotBeginNewTextItem()
+{
+    slotEndPreview();
+    TText style = m_boxes.shownStyle(m_defaultFamily);
+    Q_EMIT signalUpdateCurrentTextProperty(style);
 }

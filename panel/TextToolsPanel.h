@@ -1,47 +1,32 @@
 #pragma once
 
-#include "document/FontStyle.h"
 #include "document/TText.h"
 #include "messaging/services/SystemSetupDef.h"
+#include "panel/PanelPalette.h"
+#include "panel/PropertyBoxes.h"
 #include "panel/TextToolsPanelController.h"
+#include "panel/WorkingStyle.h"
 
 #include <QList>
 #include <QRect>
 #include <QString>
 #include <QWidget>
-#include <memory>
 #include <string>
-
-class AlignToolBox;
-class BoldToolBox;
-class ColorPalette;
-class EdgeToolBox;
-class FamilyToolBox;
-class ItalicToolBox;
-class KerningToolBox;
-class QHBoxLayout;
-class QLayout;
-class RangeOfMoveText;
-class ShadowToolBox;
-class SizeToolBox;
-class TextColorToolBox;
-class ToolBox;
 
 // The property panel under the canvas. It keeps a working copy of the style of what is selected. A tool box
 // that the operator uses changes the copy, which goes to the canvas with textStyleChange; what the canvas
 // selects comes back with updateTextStyle and is shown without an answer.
 //
-// The change path is TextToolsPanelChange.cpp, the reverse path TextToolsPanelShow.cpp. Sizes are pixels of
-// the 1920 raster, places pixels of the 1280 canvas. GUI thread only.
+// Sizes are pixels of the 1920 raster, places pixels of the 1280 canvas. GUI thread only.
 class TextToolsPanel : public QWidget
 {
     Q_OBJECT
 public:
     // Directions of a shadow.
-    static constexpr int LEFT_X = -4;
-    static constexpr int RIGHT_X = 4;
-    static constexpr int UP_Y = -4;
-    static constexpr int DOWN_Y = 4;
+    static constexpr int LEFT_X = -WorkingStyle::SHADOW_OFFSET;
+    static constexpr int RIGHT_X = WorkingStyle::SHADOW_OFFSET;
+    static constexpr int UP_Y = -WorkingStyle::SHADOW_OFFSET;
+    static constexpr int DOWN_Y = WorkingStyle::SHADOW_OFFSET;
     static constexpr int FONT_SIZE = 12;
     static constexpr int ROW_SPACING = 22;
     static constexpr int TEXTTOOL_LAYOUT_SPACING = 0;
@@ -50,9 +35,6 @@ public:
     static const QString USELESS_STR;
     static const QString FONT_DEFAULT_COLOR;
     static const QString SHADOW_DEFAULT_COLOR;
-
-    // Whose colour the palette chooses.
-    enum PaletteOwner { NO_OWNER = 0, TEXT_COLOR_OWNER = 1, EDGE_COLOR_OWNER = 2 };
 
     explicit TextToolsPanel(QWidget* parent);
     ~TextToolsPanel() override;
@@ -79,7 +61,7 @@ public:
     void hideFontSizeComboxList();
 
     // The working copy, null until the first style arrives.
-    const TText* workingStyle() const { return m_style.get(); }
+    const TText* workingStyle() const { return m_style.record(); }
 
 Q_SIGNALS:
     // The style is valid during the call only. undoFlag: 0 a preview, 1 a change, 2 a cancelled palette.
@@ -128,64 +110,18 @@ public Q_SLOTS:
     void slotAbsoluteShowCanvasMenu(bool shown);
 
 private:
-    // Building.
-    void createToolBoxes();
-    void createLayout();
-    QLayout* createLeftBlock();
-    QLayout* createMiddleBlock();
     void createConnection();
-    static const QList<TShadow>& initConstShadowValue();
-    static const QList<int>& initConstKerningValue();
-    QList<ToolBox*> boxes() const;
-
-    // The change path.
     template <typename Edit>
     void change(const std::wstring& log, int id, int undoFlag, Edit edit);
-    template <typename Edit>
-    void changeAllItems(const std::wstring& log, int id, int undoFlag, Edit edit);
-    static void setEdgeValueForTText(TextStyle& item, int on, const TEdge& edge, int kind);
-    void outPutUserLog(int on, const TEdge& edge, int undoFlag, int kind) const;
-    static QString changeintValueToString(int value);
-    void rememberStyle() const;
-    void showPalette(PaletteOwner owner, const QString& color);
-    void cancelPaletteOfOthers();
-    void saveColorList();
+    void editEdge(int on, const TEdge& edge, int undoFlag, int kind);
+    void showPalette(PanelPalette::Owner owner, const QString& color);
 
-    // The reverse path.
-    void setChildWidget();
-    void setDisplayedValueForMultiStyle(const TText* style, QString* family, int* bold, int* italic) const;
-    void setChildWidgetValue(const QString& family, int bold, int italic);
-    void setChildWidgetEnabled();
-    void setChildWidgetDisabled();
-    void showSelectionMode();
-    void showFontStyle(const FontStyle& style);
-    TText getTTextStyleForNew() const;
-
-    FamilyToolBox* m_family = nullptr;
-    SizeToolBox* m_size = nullptr;
-    BoldToolBox* m_bold = nullptr;
-    ItalicToolBox* m_italic = nullptr;
-    EdgeToolBox* m_edge = nullptr;
-    ShadowToolBox* m_shadow = nullptr;
-    AlignToolBox* m_align = nullptr;
-    KerningToolBox* m_kerning = nullptr;
-    TextColorToolBox* m_textColor = nullptr;
-    RangeOfMoveText* m_move = nullptr;
-    ColorPalette* m_palette = nullptr;
-
+    PropertyBoxes m_boxes;
+    PanelPalette m_palette;
     TextToolsPanelController m_controller;
-    std::unique_ptr<TText> m_style;
-    TShadow m_workingShadow;
-    int m_enabledForChange = 0; // 1 lets changes through
-    bool m_mixedFamily = false;
-    bool m_mixedBold = false;
-    bool m_mixedItalic = false;
-    bool m_alignEnabled = false;
-    bool m_moveEnabled = false;
+    WorkingStyle m_style;
+    bool m_changesPass = false; // to the canvas
     bool m_edgePreview = false;
-    int m_paletteOwner = NO_OWNER;
-    bool m_paletteAnswers = false; // the change that goes on is the palette's own
-    QList<QString> m_savedColors;  // one a character, for Cancel
     QString m_defaultFamily;
     QRect m_titlerWindowRect;
     SystemSetupDef::emInformationModel m_model = SystemSetupDef::emInformationModelDefault;

@@ -4,12 +4,12 @@
 #include "CanvasTestTools.h"
 
 #include "canvas/CanvasScene.h"
+#include "canvas/CaretGeometry.h"
 #include "canvas/GraphicsPixmap.h"
 #include "canvas/GraphicsView.h"
 #include "canvas/ICanvasHost.h"
 #include "canvas/IInputLanguageSource.h"
 #include "canvas/MessageBoxController.h"
-#include "canvas/TextPainter.h"
 #include "document/Archive.h"
 #include "document/TitleParser.h"
 #include "touchui/KSSoftKeyboardCursorSettingEvent.h"
@@ -81,7 +81,7 @@ class Canvas
 public:
     Canvas() : scene(std::make_unique<CanvasScene>(std::make_unique<FakeRender>(log))), view(scene.get())
     {
-        scene->setSceneRect(GraphicsText::SCENE_RECT);
+        scene->setSceneRect(TextObjectConstants::SCENE_RECT);
         view.setFrameStyle(0);
         view.setHorizontalScrollBarPolicy(Qt::ScrollBarAlwaysOff);
         view.setVerticalScrollBarPolicy(Qt::ScrollBarAlwaysOff);

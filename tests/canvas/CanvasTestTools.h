@@ -2,6 +2,8 @@
 #pragma once
 
 #include "canvas/GraphicsText.h"
+#include "canvas/InputLanguageFonts.h"
+#include "canvas/TextObjectConstants.h"
 #include "document/TText.h"
 
 #include <QString>

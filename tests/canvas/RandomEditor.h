@@ -125,7 +125,7 @@ private:
             source.setTextItems({new TextStyle(makeStyle(""))});
         source.setXValue(float(below(1600) - 200));
         source.setYValue(float(below(1000) - 150));
-        m_canvas.scene->slotChangeObjectTextStyle(&source, GraphicsText::PropertyPosition, 1);
+        m_canvas.scene->slotChangeObjectTextStyle(&source, TextObjectConstants::PropertyPosition, 1);
     }
     void drag()
     {

@@ -10,8 +10,8 @@ namespace StyleProperties
 
 inline bool isOverall(int id)
 {
-    return id == GraphicsText::PropertyShadow || id == GraphicsText::PropertyAlign ||
-           id == GraphicsText::PropertyPosition;
+    return id == TextObjectConstants::PropertyShadow || id == TextObjectConstants::PropertyAlign ||
+           id == TextObjectConstants::PropertyPosition;
 }
 
 // Gives the style or the record the first or second value of the property.
@@ -19,15 +19,15 @@ inline void set(int id, TText& source, int value)
 {
     const bool second = value != 0;
     switch (id) {
-    case GraphicsText::PropertyShadow:
+    case TextObjectConstants::PropertyShadow:
         source.setShadowStyle(second ? 2 : 1);
         source.getTextShadow()->setShadowDirectionX(second ? -1 : 1);
         source.getTextShadow()->setShadowDirectionY(1);
         return;
-    case GraphicsText::PropertyAlign:
+    case TextObjectConstants::PropertyAlign:
         source.setTextAlign(second ? 0 : 1);
         return;
-    case GraphicsText::PropertyPosition:
+    case TextObjectConstants::PropertyPosition:
         source.setXValue(second ? 222.0F : 333.0F);
         source.setYValue(second ? 111.0F : 155.0F);
         return;
@@ -37,35 +37,35 @@ inline void set(int id, TText& source, int value)
     for (TextStyle* style : source.textItems()) {
         TEdge edge = style->textEdge();
         switch (id) {
-        case GraphicsText::PropertyFamily:
+        case TextObjectConstants::PropertyFamily:
             style->setFontFamily(second ? "DFHeiW5-A" : "DejaVu Sans");
             break;
-        case GraphicsText::PropertySize:
+        case TextObjectConstants::PropertySize:
             style->setFontSize(second ? 120 : 60);
             break;
-        case GraphicsText::PropertyBold:
+        case TextObjectConstants::PropertyBold:
             style->setFontBold(second ? 0 : 1);
             break;
-        case GraphicsText::PropertyItalic:
+        case TextObjectConstants::PropertyItalic:
             style->setIsTextItalic(second ? 0 : 1);
             break;
-        case GraphicsText::PropertyColor:
+        case TextObjectConstants::PropertyColor:
             style->setFontColor(second ? "#00AA00" : "#AA0000");
             break;
-        case GraphicsText::PropertyEdge:
+        case TextObjectConstants::PropertyEdge:
             style->setIsTextEdge(second ? 0 : 1);
             break;
-        case GraphicsText::PropertyEdgeWidthPreview:
+        case TextObjectConstants::PropertyEdgeWidthPreview:
             style->setIsTextEdge(1);
             edge.setEdgeWidth(second ? 9 : 5);
             style->setTextEdge(edge);
             break;
-        case GraphicsText::PropertyEdgeWidthOrColor:
+        case TextObjectConstants::PropertyEdgeWidthOrColor:
             style->setIsTextEdge(1);
             edge.setEdgeColor(second ? "#0000FF" : "#FF00FF");
             style->setTextEdge(edge);
             break;
-        case GraphicsText::PropertyKerning:
+        case TextObjectConstants::PropertyKerning:
             style->setTextKerning(second ? 80 : 150);
             break;
         default:

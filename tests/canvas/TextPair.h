@@ -10,7 +10,7 @@ struct Pair {
     explicit Pair(const TText& record)
     {
         TText copy = record;
-        scene.setSceneRect(GraphicsText::SCENE_RECT);
+        scene.setSceneRect(TextObjectConstants::SCENE_RECT);
         parent = new GraphicsText(true, nullptr, &scene);
         child = new GraphicsText(&copy, 0, parent, nullptr);
         parent->setPos(record.getXValue(), record.getYValue());

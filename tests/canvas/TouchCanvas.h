@@ -81,7 +81,7 @@ public:
     void edit(int id, QPoint point)
     {
         touchTap(point);
-        if (text(id)->getFocusFlag() == GraphicsText::FocusObject)
+        if (text(id)->getFocusFlag() == TextObjectConstants::FocusObject)
             touchTap(point);
     }
 
@@ -95,7 +95,7 @@ public:
         QLineF line;
         QPointF point;
         int block = 0;
-        item.textPainter().carets().caretPoint(line, point, block, position);
+        item.carets().caretPoint(line, point, block, position);
         return inView(item, line.center());
     }
     // The middle of the character at a position.
@@ -109,7 +109,7 @@ public:
         QLineF line;
         QPointF point;
         int block = 0;
-        item.textPainter().carets().caretPoint(line, point, block, position);
+        item.carets().caretPoint(line, point, block, position);
         return point;
     }
     QPoint handleIn(GraphicsText& item, int position) const

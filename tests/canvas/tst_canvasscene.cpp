@@ -1,5 +1,7 @@
 #include "CanvasFixture.h"
 
+#include "canvas/StyleDispatch.h"
+
 // The canvas: titles, objects, style changes, undo, touch and keyboard.
 class tst_canvasscene : public QObject
 {
@@ -322,8 +324,8 @@ void tst_canvasscene::chinaModel()
 {
     Canvas canvas;
     canvas.scene->setModuleInfo(SystemSetupDef::emInformationModelChina);
-    QVERIFY(GraphicsText::IS_CN_MODULE);
-    for (const auto& row : GraphicsText::LAST_KEEPED_FONT) {
+    QVERIFY(InputLanguageFonts::IS_CN_MODULE);
+    for (const auto& row : InputLanguageFonts::LAST_KEEPED_FONT) {
         for (const QString& family : row)
             QCOMPARE(family, QStringLiteral("DFHeiW5-A"));
     }
@@ -339,8 +341,8 @@ void tst_canvasscene::chinaModel()
         canvas.scene->getTextItemList().last()->getLastAlpaTextStyleValue()->textItems()[0]->getFontFamily(),
         std::string("DejaVu Sans"));
     canvas.scene->setModuleInfo(SystemSetupDef::emInformationModelDefault);
-    QVERIFY(!GraphicsText::IS_CN_MODULE);
-    QVERIFY(GraphicsText::LAST_KEEPED_FONT == GraphicsText::LANGUAGE_DEFAULT_FONT);
+    QVERIFY(!InputLanguageFonts::IS_CN_MODULE);
+    QVERIFY(InputLanguageFonts::LAST_KEEPED_FONT == InputLanguageFonts::LANGUAGE_DEFAULT_FONT);
 }
 
 void tst_canvasscene::modeTable_data()
@@ -368,7 +370,7 @@ void tst_canvasscene::modeTable()
     QFETCH(bool, overall);
     QFETCH(bool, same);
     QFETCH(int, mode);
-    QCOMPARE(CanvasScene::getItemTextEditId(status, overall, same), mode);
+    QCOMPARE(StyleDispatch::getItemTextEditId(status, overall, same), mode);
 }
 
 void tst_canvasscene::styleOfSelectedObject()

@@ -154,7 +154,7 @@ void tst_canvasscene_saving::leavingTheTitleTakesBlanksAway()
     QVERIFY(canvas.text(4));
     canvas.scene->slotInsertNewTextItem();
     QVERIFY(messages->posted.isEmpty());
-    QVERIFY(canvas.text(4) && canvas.text(4)->getFocusFlag() == GraphicsText::FocusEdit);
+    QVERIFY(canvas.text(4) && canvas.text(4)->getFocusFlag() == TextObjectConstants::FocusEdit);
 }
 
 void tst_canvasscene_saving::deletedLastObjectIsSaved()

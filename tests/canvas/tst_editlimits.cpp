@@ -82,8 +82,8 @@ void tst_editlimits::threeHundredOfEveryStyle()
     // One property of all of them; the others stay as mixed as they were.
     item->changeItemToSolidLineState();
     TText source = record;
-    StyleProperties::set(GraphicsText::PropertySize, source, 0);
-    canvas.scene->slotChangeObjectTextStyle(&source, GraphicsText::PropertySize, 1);
+    StyleProperties::set(TextObjectConstants::PropertySize, source, 0);
+    canvas.scene->slotChangeObjectTextStyle(&source, TextObjectConstants::PropertySize, 1);
     QVERIFY(item->getItemTText()->textItemsIsTheSame(source));
     canvas.stack.undo();
     QVERIFY(item->getItemTText()->textItemsIsTheSame(record));
@@ -261,14 +261,14 @@ void tst_editlimits::sizes()
     TText source = record;
     for (TextStyle* style : source.textItems())
         style->setFontSize(size);
-    canvas.scene->slotChangeObjectTextStyle(&source, GraphicsText::PropertySize, 1);
+    canvas.scene->slotChangeObjectTextStyle(&source, TextObjectConstants::PropertySize, 1);
     QVERIFY(inStep(*item));
     for (const TextStyle* style : item->getItemTText()->textItems())
         QCOMPARE(style->getFontSize(), size);
     QLineF line;
     QPointF point;
     int block = 0;
-    QVERIFY(item->textPainter().carets().caretPoint(line, point, block, 1));
+    QVERIFY(item->carets().caretPoint(line, point, block, 1));
     // A line is about as high as its characters at two thirds of their size.
     QVERIFY(line.length() > size * 0.6 && line.length() < size * 1.2);
     // The shadow scales with the size.
@@ -405,7 +405,7 @@ void tst_editlimits::removedFont()
     // So does what is styled, undone and redone.
     selectRange(*item, 0, 1);
     TText source = makeSource(makeStyle("", family.constData(), 50), 1);
-    canvas.scene->slotChangeObjectTextStyle(&source, GraphicsText::PropertySize, 1);
+    canvas.scene->slotChangeObjectTextStyle(&source, TextObjectConstants::PropertySize, 1);
     QCOMPARE(item->getItemTText()->textItems()[0]->getFontSize(), 50);
     QCOMPARE(item->getItemTText()->textItems()[0]->getFontFamily(), std::string("KST"));
     while (canvas.stack.canUndo())

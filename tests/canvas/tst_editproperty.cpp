@@ -1,5 +1,4 @@
 #include "RandomEditor.h"
-#include "canvas/TextStyleEditor.h"
 
 #include <QElapsedTimer>
 #include <QFile>
@@ -139,7 +138,7 @@ QList<TText> someTexts()
 
 // What is known of one object at one place of the stack.
 struct Object {
-    explicit Object(GraphicsText* item) : typing(item->styleEditor().isTyping())
+    explicit Object(GraphicsText* item) : typing(item->isTyping())
     {
         TText shown = *item->getItemTText();
         place = QString("%1 %2 %3").arg(shown.getXValue()).arg(shown.getYValue()).arg(shown.getZValue());

@@ -1,8 +1,8 @@
 #include "TextPair.h"
 
+#include "canvas/CaretGeometry.h"
 #include "canvas/CharacterFormat.h"
 #include "canvas/StyleDocument.h"
-#include "canvas/TextPainter.h"
 
 #include <QClipboard>
 #include <QGraphicsDropShadowEffect>
@@ -92,7 +92,7 @@ void tst_graphicstext::typeAndFlags()
     QCOMPARE(pair.child->document()->documentMargin(), 27.0);
     pair.child->setRadio(1.0, true);
     QCOMPARE(pair.child->document()->documentMargin(), 40.5);
-    pair.child->setRadio(GraphicsText::SCENEPERCENTAGE, false);
+    pair.child->setRadio(TextObjectConstants::SCENEPERCENTAGE, false);
     QCOMPARE(pair.child->document()->documentMargin(), 27.0);
     QCOMPARE(int(Qt::TextEditorInteraction), 19);
 }
@@ -105,7 +105,7 @@ void tst_graphicstext::loadingKeepsOneStylePerCharacter()
     QCOMPARE(pair.child->toPlainText(), QStringLiteral("one\ntwo"));
     QVERIFY(inStep(*pair.child));
     QCOMPARE(pair.record().textItems()[2]->getFontSize(), 30);
-    QCOMPARE(QString::fromStdString(pair.record().textItems()[3]->getText()), GraphicsText::ENTER);
+    QCOMPARE(QString::fromStdString(pair.record().textItems()[3]->getText()), TextObjectConstants::ENTER);
     // Loading again shows the same.
     const QRectF before = pair.child->layoutRect();
     pair.child->initShowText();
@@ -505,7 +505,7 @@ void tst_graphicstext::moveByPanel()
     // Too far right: a hundred pixels stay inside.
     source.setXValue(5000.0F);
     pair.child->changeAllStyleWhenSelectionMode(&source, 11, true, 1);
-    QCOMPARE(pair.parent->x(), GraphicsText::SCENE_RECT.width() - 100.0);
+    QCOMPARE(pair.parent->x(), TextObjectConstants::SCENE_RECT.width() - 100.0);
     source.setXValue(-5000.0F);
     pair.child->changeAllStyleWhenSelectionMode(&source, 11, true, 1);
     QCOMPARE(pair.parent->x(), -(pair.child->layoutRect().width() - 100.0));
@@ -561,8 +561,8 @@ void tst_graphicstext::shadowEffect()
     QGraphicsDropShadowEffect* effect = pair.child->shadowEffect();
     QVERIFY(effect->isEnabled());
     QCOMPARE(effect->color(), QColor(0, 0, 0, 190));
-    QCOMPARE(effect->xOffset(), -8.0 * GraphicsText::SCENEPERCENTAGE);
-    QCOMPARE(effect->yOffset(), 8.0 * GraphicsText::SCENEPERCENTAGE);
+    QCOMPARE(effect->xOffset(), -8.0 * TextObjectConstants::SCENEPERCENTAGE);
+    QCOMPARE(effect->yOffset(), 8.0 * TextObjectConstants::SCENEPERCENTAGE);
     QCOMPARE(effect->blurRadius(), 32.0);
     QCOMPARE(pair.child->graphicsEffect(), effect);
     QVERIFY(!pair.parent->graphicsEffect()->isEnabled());
@@ -607,7 +607,7 @@ void tst_graphicstext::formatOfACharacter()
     style.setIsTextItalic(1);
     style.setTextKerning(120);
     style.setFontColor("#FF8000");
-    const QTextCharFormat format = CharacterFormat::layoutFormat(style, GraphicsText::SCENEPERCENTAGE);
+    const QTextCharFormat format = CharacterFormat::layoutFormat(style, TextObjectConstants::SCENEPERCENTAGE);
     QCOMPARE(format.intProperty(QTextFormat::FontPixelSize), 43);
     QCOMPARE(format.fontWeight(), int(QFont::Bold));
     QVERIFY(format.fontItalic());
@@ -621,7 +621,7 @@ void tst_graphicstext::formatOfACharacter()
     TEdge edge;
     edge.setEdgeWidth(4);
     style.setTextEdge(edge);
-    QCOMPARE(CharacterFormat::outlineWidth(style, GraphicsText::SCENEPERCENTAGE), 5);
+    QCOMPARE(CharacterFormat::outlineWidth(style, TextObjectConstants::SCENEPERCENTAGE), 5);
     QCOMPARE(CharacterFormat::font(style, 1.0).pixelSize(), 64);
     style.setFontSize(-3);
     QCOMPARE(CharacterFormat::pixelSize(style, 1.0), 1);

@@ -100,7 +100,7 @@ void tst_handles::longPress()
     canvas.release(point);
     QVERIFY(item->isHandleCaret());
     QCOMPARE(qAbs(item->textCursor().anchor() - item->textCursor().position()), 1);
-    QCOMPARE(item->getFocusFlag(), int(GraphicsText::FocusEdit));
+    QCOMPARE(item->getFocusFlag(), int(TextObjectConstants::FocusEdit));
 }
 
 void tst_handles::longPressOnNoWord()
@@ -144,7 +144,7 @@ void tst_handles::longPressNeedsEditing()
     canvas.touchTap(canvas.caretIn(*item, 2));
     item->slotLongPressed();
     QVERIFY(!item->textCursor().hasSelection());
-    QCOMPARE(item->getFocusFlag(), int(GraphicsText::FocusObject));
+    QCOMPARE(item->getFocusFlag(), int(TextObjectConstants::FocusObject));
 }
 
 void tst_handles::grabBesideTheHandle_data()
@@ -175,7 +175,7 @@ void tst_handles::grabBesideTheHandle()
     QCOMPARE(item->textCursor().anchor(), 2);
     QCOMPARE(item->textCursor().position(), 7);
     QVERIFY(item->isHandleCaret());
-    QCOMPARE(item->getFocusFlag(), int(GraphicsText::FocusEdit));
+    QCOMPARE(item->getFocusFlag(), int(TextObjectConstants::FocusEdit));
     QCOMPARE(canvas.stack.count(), 0);
 }
 

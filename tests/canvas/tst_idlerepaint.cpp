@@ -1,6 +1,5 @@
 // The canvas is repainted for a cause, and never while nothing happens.
 #include "CanvasFixture.h"
-#include "canvas/TextStyleEditor.h"
 
 #include <QAbstractEventDispatcher>
 #include <QTimerEvent>
@@ -173,13 +172,13 @@ void tst_idlerepaint::causes_data()
         TextStyle style = makeStyle("");
         style.setFontColor("#00AA00");
         TText source = makeSource(style, 3);
-        c.scene->slotChangeObjectTextStyle(&source, GraphicsText::PropertyColor, 1);
+        c.scene->slotChangeObjectTextStyle(&source, TextObjectConstants::PropertyColor, 1);
     });
     QTest::newRow("a shadow") << "selected" << Action([](Canvas& c) {
         TText source = makeSource(makeStyle(""), 10);
         source.setShadowStyle(2);
         source.getTextShadow()->setShadowDirectionX(-1);
-        c.scene->slotChangeObjectTextStyle(&source, GraphicsText::PropertyShadow, 1);
+        c.scene->slotChangeObjectTextStyle(&source, TextObjectConstants::PropertyShadow, 1);
     });
     QTest::newRow("a tap") << "none" << Action([](Canvas& c) { c.tap(c.pointOn(1)); });
     QTest::newRow("leaving") << "caret" << Action([](Canvas& c) { c.tap(EmptyPlace); });
@@ -217,7 +216,7 @@ void tst_idlerepaint::movedShadow()
     const QImage before = m_canvas->view.grab().toImage();
     text->parentTextItem()->setPos(place + step);
     const QImage moved = m_canvas->view.grab().toImage();
-    text->textPainter().invalidate();
+    text->setRadio(text->canvasRatio(), false); // forgets what is kept of the picture
     QCOMPARE(moved, m_canvas->view.grab().toImage());
     QVERIFY(moved != before);
 }
@@ -236,13 +235,13 @@ void tst_idlerepaint::keptPictureFollowsTheText()
     TText source = makeSource(makeStyle("", "KST", 60), 10);
     for (TextStyle* style : source.textItems())
         style->setFontColor("#00AA00");
-    change(GraphicsText::PropertyColor, source);
+    change(TextObjectConstants::PropertyColor, source);
     QVERIFY(grab() != last);
     last = grab();
     source.setShadowStyle(2);
     source.getTextShadow()->setShadowDirectionX(-1);
     source.getTextShadow()->setShadowDirectionY(-1);
-    change(GraphicsText::PropertyShadow, source);
+    change(TextObjectConstants::PropertyShadow, source);
     QVERIFY(grab() != last);
     last = grab();
     m_canvas->stack.undo();

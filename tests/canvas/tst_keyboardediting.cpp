@@ -362,11 +362,11 @@ void tst_keyboardediting::emojiAndMarkSurvive()
     // Styled: everything, then half of the pair, which no tool can select alone.
     selectRange(*item, 0, 6);
     TText large = makeSource(makeStyle("", "KST", 150), 6);
-    canvas.scene->slotChangeObjectTextStyle(&large, GraphicsText::PropertySize, 1);
+    canvas.scene->slotChangeObjectTextStyle(&large, TextObjectConstants::PropertySize, 1);
     selectRange(*item, 1, 2);
     TText bold = makeSource(makeStyle(""), 1);
     bold.textItems()[0]->setFontBold(1);
-    canvas.scene->slotChangeObjectTextStyle(&bold, GraphicsText::PropertyBold, 1);
+    canvas.scene->slotChangeObjectTextStyle(&bold, TextObjectConstants::PropertyBold, 1);
     QCOMPARE(item->toPlainText(), text);
     QVERIFY(inStep(*item));
     // Saved and loaded.
@@ -497,8 +497,8 @@ void tst_keyboardediting::cursorMessageDuringADrag()
 void tst_keyboardediting::changeOfTheWholeEndsEditing_data()
 {
     QTest::addColumn<int>("property");
-    QTest::newRow("align") << int(GraphicsText::PropertyAlign);
-    QTest::newRow("shadow") << int(GraphicsText::PropertyShadow);
+    QTest::newRow("align") << int(TextObjectConstants::PropertyAlign);
+    QTest::newRow("shadow") << int(TextObjectConstants::PropertyShadow);
 }
 
 // With all of the text selected these tools apply; the object is selected as one after that.
@@ -564,7 +564,7 @@ void tst_keyboardediting::closeOnText()
     QCOMPARE(item->textInteractionFlags(), Qt::NoTextInteraction);
     QVERIFY(!item->hasFocus());
     QVERIFY(!item->textCursor().hasSelection());
-    QCOMPARE(item->parentTextItem()->getFocusFlag(), int(GraphicsText::FocusObject));
+    QCOMPARE(item->parentTextItem()->getFocusFlag(), int(TextObjectConstants::FocusObject));
     QCOMPARE(modes.last(), QVariantList({true, true}));
     QCOMPARE(exists.last(), QVariantList({true}));
     QVERIFY(KSInputContext::isSoftKeyboardClosed());
@@ -736,7 +736,7 @@ void tst_keyboardediting::serviceDiesInMidWord()
     QCOMPARE(m_keyboard->keys.size(), 1);
     QCOMPARE(item->toPlainText(), QStringLiteral("MBreaking"));
     QVERIFY(KSInputContext::isSoftKeyboardClosed());
-    QCOMPARE(item->getFocusFlag(), int(GraphicsText::FocusEdit));
+    QCOMPARE(item->getFocusFlag(), int(TextObjectConstants::FocusEdit));
     // Leaving saves all of it, as one step.
     canvas.touchTap(QPoint(80, 600));
     QCOMPARE(canvas.saved()->getText()[0]->getText(), std::string("MBreaking"));
@@ -759,7 +759,7 @@ void tst_keyboardediting::serviceDiesWithoutATrace()
     QCOMPARE(canvas.stack.count(), 0);
     QTRY_COMPARE_WITH_TIMEOUT(canvas.stack.count(), 1, 10000);
     QCOMPARE(canvas.saved()->getText()[0]->getText(), std::string("MBrea"));
-    QCOMPARE(canvas.text(1)->getFocusFlag(), int(GraphicsText::FocusEdit));
+    QCOMPARE(canvas.text(1)->getFocusFlag(), int(TextObjectConstants::FocusEdit));
 }
 
 int main(int argc, char** argv)

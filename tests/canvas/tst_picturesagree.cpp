@@ -160,7 +160,7 @@ void tst_picturesagree::everyProperty_data()
             if (value == 1 && (id == 2 || id == 3 || id == 5))
                 continue;
             // Shadows are lighter on the canvas, and as wide in pixels there as on the larger raster.
-            const bool shadow = id == GraphicsText::PropertyShadow;
+            const bool shadow = id == TextObjectConstants::PropertyShadow;
             QTest::addRow("%s %d", names[id], value)
                 << id << value << (shadow ? 40.0 : 24.0) << (shadow ? 24 : 3);
         }

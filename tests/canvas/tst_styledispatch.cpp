@@ -158,13 +158,13 @@ void tst_styledispatch::rowsOfTheTable()
         selectRange(*item, 4, 2);
     QCOMPARE(item->getStatusId(), status);
     const QStringList before = stylesOf(*item);
-    TText source = sent(*item, GraphicsText::PropertySize, 0);
+    TText source = sent(*item, TextObjectConstants::PropertySize, 0);
     if (!same)
         source.textItems()[1]->setFontColor("#010203");
     source.setTextAlign(1);
     QCOMPARE(canvas.scene->isTheSame(&source), same);
     canvas.scene->slotChangeObjectTextStyle(
-        &source, overall ? GraphicsText::PropertyAlign : GraphicsText::PropertySize, 1);
+        &source, overall ? TextObjectConstants::PropertyAlign : TextObjectConstants::PropertySize, 1);
     const QStringList now = stylesOf(*item);
     int different = 0;
     for (int i = 0; i < now.size(); ++i)
@@ -238,7 +238,7 @@ void tst_styledispatch::everyPropertyOfASelection()
             QCOMPARE(item->getStatusId(), 0);
             // Only the move buttons place an object, and they are off while characters are selected.
             QCOMPARE(StyleProperties::describe(*item->getItemTText()) == record,
-                     id == GraphicsText::PropertyPosition);
+                     id == TextObjectConstants::PropertyPosition);
             QCOMPARE(item->scenePos().y(), 200.0);
         } else {
             for (int i = 0; i < 6; ++i) {
@@ -309,13 +309,13 @@ void tst_styledispatch::everyPropertyOfAnEmptyObject()
     canvas.scene->slotChangeObjectTextStyle(&source, id, 1);
     QCOMPARE(canvas.stack.count(), commands + (StyleProperties::isOverall(id) ? 1 : 0));
     QCOMPARE(item->toPlainText(), QString());
-    QCOMPARE(item->getItemTText()->getXValue() != x, id == GraphicsText::PropertyPosition);
+    QCOMPARE(item->getItemTText()->getXValue() != x, id == TextObjectConstants::PropertyPosition);
     if (item->getStatusId() != 2)
         item->initNewTextSelectAll();
     typeText(*item, "a");
     if (!StyleProperties::isOverall(id))
         QCOMPARE(stylesOf(*item).first(), StyleProperties::describe(*source.textItems().front()));
-    QCOMPARE(item->getItemTText()->getTextAlign(), id == GraphicsText::PropertyAlign ? 1 : -1);
+    QCOMPARE(item->getItemTText()->getTextAlign(), id == TextObjectConstants::PropertyAlign ? 1 : -1);
     QVERIFY(inStep(*item));
 }
 
@@ -371,8 +371,8 @@ void tst_styledispatch::previewThenCancel()
     QCOMPARE(canvas.stack.count(), 0);
     QCOMPARE(StyleProperties::describe(*item->getItemTText()), before);
     // The next step starts from there.
-    TText commit = sent(*item, GraphicsText::PropertyKerning, 0);
-    canvas.scene->slotChangeObjectTextStyle(&commit, GraphicsText::PropertyKerning, 1);
+    TText commit = sent(*item, TextObjectConstants::PropertyKerning, 0);
+    canvas.scene->slotChangeObjectTextStyle(&commit, TextObjectConstants::PropertyKerning, 1);
     canvas.stack.undo();
     QCOMPARE(StyleProperties::describe(*item->getItemTText()), before);
 }
@@ -395,10 +395,10 @@ void tst_styledispatch::sliderMovedAndReturned()
             edge.setEdgeWidth(width);
             style->setTextEdge(edge);
         }
-        canvas.scene->slotChangeObjectTextStyle(&preview, GraphicsText::PropertyEdgeWidthPreview, 0);
+        canvas.scene->slotChangeObjectTextStyle(&preview, TextObjectConstants::PropertyEdgeWidthPreview, 0);
     }
     TText commit = original;
-    canvas.scene->slotChangeObjectTextStyle(&commit, GraphicsText::PropertyEdgeWidthOrColor, 1);
+    canvas.scene->slotChangeObjectTextStyle(&commit, TextObjectConstants::PropertyEdgeWidthOrColor, 1);
     QCOMPARE(StyleProperties::describe(*item->getItemTText()), before);
     while (canvas.stack.canUndo())
         canvas.stack.undo();
@@ -417,14 +417,14 @@ void tst_styledispatch::mixedColoursComeBack()
     item->initNewTextSelectAll();
     selectRange(*item, 0, 4);
     TText original = sent(*item, 99, 0);
-    TText preview = sent(*item, GraphicsText::PropertyColor, 1);
-    canvas.scene->slotChangeObjectTextStyle(&preview, GraphicsText::PropertyColor, 0);
+    TText preview = sent(*item, TextObjectConstants::PropertyColor, 1);
+    canvas.scene->slotChangeObjectTextStyle(&preview, TextObjectConstants::PropertyColor, 0);
     QCOMPARE(item->getItemTText()->textItems()[3]->getFontColor(), std::string("#00AA00"));
-    canvas.scene->slotChangeObjectTextStyle(&original, GraphicsText::PropertyColor, 2);
+    canvas.scene->slotChangeObjectTextStyle(&original, TextObjectConstants::PropertyColor, 2);
     for (size_t i = 0; i < 4; ++i)
         QCOMPARE(item->getItemTText()->textItems()[i]->getFontColor(), std::string(colours[i]));
     // OK makes them one colour; undo makes them many again.
-    canvas.scene->slotChangeObjectTextStyle(&preview, GraphicsText::PropertyColor, 1);
+    canvas.scene->slotChangeObjectTextStyle(&preview, TextObjectConstants::PropertyColor, 1);
     QCOMPARE(canvas.stack.count(), 1);
     canvas.stack.undo();
     for (size_t i = 0; i < 4; ++i)
@@ -446,7 +446,7 @@ void tst_styledispatch::sizesStepFromMixedSelections()
     TText source = sent(*item, 99, 0);
     for (size_t i = 0; i < 4; ++i)
         source.textItems()[i]->setFontSize(stepped[i]);
-    canvas.scene->slotChangeObjectTextStyle(&source, GraphicsText::PropertySize, 1);
+    canvas.scene->slotChangeObjectTextStyle(&source, TextObjectConstants::PropertySize, 1);
     for (size_t i = 0; i < 4; ++i)
         QCOMPARE(item->getItemTText()->textItems()[i]->getFontSize(), stepped[i]);
     QVERIFY(inStep(*item));
@@ -462,8 +462,8 @@ void tst_styledispatch::previewLeftByTyping()
     GraphicsText* item = canvas.text(1);
     item->initNewTextSelectAll();
     selectRange(*item, 0, 4);
-    TText preview = sent(*item, GraphicsText::PropertyColor, 0);
-    canvas.scene->slotChangeObjectTextStyle(&preview, GraphicsText::PropertyColor, 0);
+    TText preview = sent(*item, TextObjectConstants::PropertyColor, 0);
+    canvas.scene->slotChangeObjectTextStyle(&preview, TextObjectConstants::PropertyColor, 0);
     typeTextAt(*item, 4, "e");
     for (const TextStyle* style : item->getItemTText()->textItems())
         QCOMPARE(style->getFontColor(), std::string("#FFFFFF"));
@@ -521,8 +521,8 @@ void tst_styledispatch::movedCaretForgetsTheStyle()
     GraphicsText* item = canvas.text(1);
     item->initNewTextSelectAll();
     item->getSelectionInfo(0, 0, 2, 0);
-    TText source = sent(*item, GraphicsText::PropertySize, 0);
-    canvas.scene->slotChangeObjectTextStyle(&source, GraphicsText::PropertySize, 1);
+    TText source = sent(*item, TextObjectConstants::PropertySize, 0);
+    canvas.scene->slotChangeObjectTextStyle(&source, TextObjectConstants::PropertySize, 1);
     item->getSelectionInfo(0, 0, 3, 0);
     item->getSelectionInfo(0, 0, 2, 0);
     typeText(*item, "x");
@@ -537,8 +537,8 @@ void tst_styledispatch::styleAfterTyping()
     item->initNewTextSelectAll();
     typeTextAt(*item, 3, "d");
     selectRange(*item, 0, 4);
-    TText source = sent(*item, GraphicsText::PropertySize, 0);
-    canvas.scene->slotChangeObjectTextStyle(&source, GraphicsText::PropertySize, 1);
+    TText source = sent(*item, TextObjectConstants::PropertySize, 0);
+    canvas.scene->slotChangeObjectTextStyle(&source, TextObjectConstants::PropertySize, 1);
     // Typing is a step of its own below that of the style.
     QCOMPARE(canvas.stack.count(), 2);
     canvas.stack.undo();
@@ -556,7 +556,7 @@ void tst_styledispatch::unknownProperty()
     item->changeItemToSolidLineState();
     const QString before = StyleProperties::describe(*item->getItemTText());
     for (const int id : {-1, 12, 99}) {
-        TText source = sent(*item, GraphicsText::PropertySize, 0);
+        TText source = sent(*item, TextObjectConstants::PropertySize, 0);
         canvas.scene->slotChangeObjectTextStyle(&source, id, 1);
         QCOMPARE(StyleProperties::describe(*item->getItemTText()), before);
     }
@@ -616,7 +616,7 @@ void tst_styledispatch::picturesAreMarkedOutOfDate()
     TText source = makeSource(makeStyle(""), 3);
     if (!same)
         source.textItems()[1]->setFontColor("#010203");
-    canvas.scene->slotChangeObjectTextStyle(&source, GraphicsText::PropertySize, 0);
+    canvas.scene->slotChangeObjectTextStyle(&source, TextObjectConstants::PropertySize, 0);
     canvas.scene->slotMakeSceneThumnail();
     QCOMPARE(canvas.log.slow, pictures);
 }

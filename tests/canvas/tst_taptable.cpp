@@ -2,7 +2,7 @@
 
 #include <QTouchEvent>
 
-#include "canvas/TouchTextEditor.h"
+#include "canvas/TextPlacement.h"
 
 // What one finger does to the text objects of a canvas, as touches that pass the application's gate: select,
 // edit, drag, and that a second finger changes nothing.
@@ -80,9 +80,9 @@ void tst_taptable::firstTapSelects()
     connect(item, &GraphicsText::signalNotifyPropertyAreaObjectSelectionStyleChange, item,
             [&shown](TText* style) { shown = int(style->textItems().size()); });
     canvas.touchTap(canvas.characterIn(*item, 1));
-    QCOMPARE(item->getFocusFlag(), int(GraphicsText::FocusObject));
-    QCOMPARE(item->getBoundingLineStatus(), int(GraphicsText::FocusObject));
-    QCOMPARE(item->parentTextItem()->getFocusFlag(), int(GraphicsText::FocusObject));
+    QCOMPARE(item->getFocusFlag(), int(TextObjectConstants::FocusObject));
+    QCOMPARE(item->getBoundingLineStatus(), int(TextObjectConstants::FocusObject));
+    QCOMPARE(item->parentTextItem()->getFocusFlag(), int(TextObjectConstants::FocusObject));
     QCOMPARE(item->textInteractionFlags(), Qt::NoTextInteraction);
     QVERIFY(!item->textCursor().hasSelection());
     QVERIFY(!item->isHandleCaret());
@@ -113,8 +113,8 @@ void tst_taptable::secondTapEditsWhereItFell()
     QSignalSpy modes(canvas.scene.get(), &CanvasScene::signalSceneNotifyTextPropertyAreaObjectSelectionMode);
     canvas.touchTap(canvas.characterIn(*item, 1));
     canvas.touchTap(canvas.caretIn(*item, position));
-    QCOMPARE(item->getFocusFlag(), int(GraphicsText::FocusEdit));
-    QCOMPARE(item->parentTextItem()->getFocusFlag(), int(GraphicsText::FocusEdit));
+    QCOMPARE(item->getFocusFlag(), int(TextObjectConstants::FocusEdit));
+    QCOMPARE(item->parentTextItem()->getFocusFlag(), int(TextObjectConstants::FocusEdit));
     QCOMPARE(item->textInteractionFlags(), Qt::TextEditorInteraction);
     QVERIFY(item->hasFocus());
     QCOMPARE(item->textCursor().position(), position);
@@ -132,7 +132,7 @@ void tst_taptable::thirdTapStaysInEditing()
     GraphicsText* item = canvas.text(1);
     canvas.edit(1, canvas.caretIn(*item, 1));
     canvas.touchTap(canvas.caretIn(*item, 4));
-    QCOMPARE(item->getFocusFlag(), int(GraphicsText::FocusEdit));
+    QCOMPARE(item->getFocusFlag(), int(TextObjectConstants::FocusEdit));
     QCOMPARE(item->textCursor().position(), 4);
     QVERIFY(!item->textCursor().hasSelection());
 }
@@ -167,10 +167,10 @@ void tst_taptable::tapOnAnotherObject()
     canvas.edit(1, canvas.caretIn(*item, 3));
     typeText(*item, "d");
     canvas.touchTap(canvas.characterIn(*canvas.text(2), 2));
-    QCOMPARE(item->getFocusFlag(), int(GraphicsText::FocusNone));
+    QCOMPARE(item->getFocusFlag(), int(TextObjectConstants::FocusNone));
     QCOMPARE(item->textInteractionFlags(), Qt::NoTextInteraction);
-    QCOMPARE(item->parentTextItem()->getFocusFlag(), int(GraphicsText::FocusNone));
-    QCOMPARE(canvas.text(2)->getFocusFlag(), int(GraphicsText::FocusObject));
+    QCOMPARE(item->parentTextItem()->getFocusFlag(), int(TextObjectConstants::FocusNone));
+    QCOMPARE(canvas.text(2)->getFocusFlag(), int(TextObjectConstants::FocusObject));
     // Leaving made a step of what was typed.
     QCOMPARE(canvas.stack.count(), 1);
     QCOMPARE(canvas.saved()->getText()[0]->getText(), std::string("abcd"));
@@ -186,7 +186,7 @@ void tst_taptable::tapOnEmptyCanvas()
     QSignalSpy pressed(canvas.scene.get(), &CanvasScene::signalCanvasSceneMousePressed);
     // Within the screen of the test, beyond which no touch finds its window.
     canvas.touchTap(QPoint(80, 600));
-    QCOMPARE(canvas.text(1)->getFocusFlag(), int(GraphicsText::FocusNone));
+    QCOMPARE(canvas.text(1)->getFocusFlag(), int(TextObjectConstants::FocusNone));
     QCOMPARE(canvas.text(1)->textInteractionFlags(), Qt::NoTextInteraction);
     QCOMPARE(exists.last(), QVariantList({false}));
     QCOMPARE(pressed.count(), 1);
@@ -213,7 +213,7 @@ void tst_taptable::dragOfASelectedObject()
     canvas.release(from + QPoint(64, -32));
     QCOMPARE(item->scenePos(), QPointF(364.0, 168.0));
     QCOMPARE(item->pos(), QPointF());
-    QCOMPARE(item->getFocusFlag(), int(GraphicsText::FocusObject));
+    QCOMPARE(item->getFocusFlag(), int(TextObjectConstants::FocusObject));
     QCOMPARE(item->textInteractionFlags(), Qt::NoTextInteraction);
     QCOMPARE(keyboard.last().at(0).value<GraphicsText*>(), nullptr);
     QCOMPARE(canvas.stack.count(), 1);
@@ -234,7 +234,7 @@ void tst_taptable::dragOfAnObjectThatIsNotSelected()
     canvas.open({makeRecord("abc")});
     canvas.touchDrag(canvas.pointOn(1), canvas.pointOn(1) + QPoint(64, 32));
     QCOMPARE(canvas.text(1)->scenePos(), QPointF(300.0, 200.0));
-    QCOMPARE(canvas.text(1)->getFocusFlag(), int(GraphicsText::FocusObject));
+    QCOMPARE(canvas.text(1)->getFocusFlag(), int(TextObjectConstants::FocusObject));
     QCOMPARE(canvas.stack.count(), 0);
 }
 
@@ -247,7 +247,7 @@ void tst_taptable::dragWhileEditingMovesNothing()
     canvas.edit(1, canvas.caretIn(*item, 1));
     canvas.touchDrag(canvas.caretIn(*item, 1), canvas.caretIn(*item, 3));
     QCOMPARE(item->scenePos(), QPointF(300.0, 200.0));
-    QCOMPARE(item->getFocusFlag(), int(GraphicsText::FocusEdit));
+    QCOMPARE(item->getFocusFlag(), int(TextObjectConstants::FocusEdit));
     // Without handles there is nothing to drag.
     QVERIFY(!item->textCursor().hasSelection());
     QCOMPARE(canvas.stack.count(), 0);
@@ -265,7 +265,7 @@ void tst_taptable::jitterIsATap()
     canvas.move(point + QPoint(-3, 2));
     canvas.release(point);
     QCOMPARE(canvas.text(1)->scenePos(), QPointF(300.0, 200.0));
-    QCOMPARE(canvas.text(1)->getFocusFlag(), int(GraphicsText::FocusEdit));
+    QCOMPARE(canvas.text(1)->getFocusFlag(), int(TextObjectConstants::FocusEdit));
 }
 
 void tst_taptable::dragAgainstALimit_data()
@@ -302,7 +302,7 @@ void tst_taptable::dragAgainstALimit()
     QCOMPARE(item->scenePos(), expected);
     QCOMPARE(item->parentTextItem()->pos(), expected);
     QCOMPARE(item->pos(), QPointF());
-    QCOMPARE(item->getFocusFlag(), int(GraphicsText::FocusObject));
+    QCOMPARE(item->getFocusFlag(), int(TextObjectConstants::FocusObject));
     QCOMPARE(canvas.stack.count(), 1);
     QCOMPARE(item->getItemTText()->getXValue(), float(expected.x()));
     QCOMPARE(item->getItemTText()->getYValue(), float(expected.y()));
@@ -366,7 +366,7 @@ void tst_taptable::doubleTap()
     canvas.quickTap(canvas.pointOn(1));
     QCOMPARE(item->textCursor().selectionStart(), 0);
     QCOMPARE(item->textCursor().selectionEnd(), 7);
-    QCOMPARE(item->getFocusFlag(), int(GraphicsText::FocusEdit));
+    QCOMPARE(item->getFocusFlag(), int(TextObjectConstants::FocusEdit));
     QCOMPARE(item->textInteractionFlags(), Qt::TextEditorInteraction);
     QVERIFY(item->isDoubleClickedSelection());
     QVERIFY(!item->isHandleCaret());
@@ -409,7 +409,7 @@ void tst_taptable::tapAfterADoubleTap()
     QVERIFY(!item->isDoubleClickedSelection());
     QVERIFY(!item->textCursor().hasSelection());
     QCOMPARE(item->textCursor().position(), 2);
-    QCOMPARE(item->getFocusFlag(), int(GraphicsText::FocusEdit));
+    QCOMPARE(item->getFocusFlag(), int(TextObjectConstants::FocusEdit));
 }
 
 // The object returns to its place and lets go of the finger.
@@ -434,7 +434,7 @@ void tst_taptable::cancelledDragPutsTheObjectBack()
     // A second one has nothing to end.
     QTouchEvent again(QEvent::TouchCancel, m_device);
     QCoreApplication::sendEvent(canvas.view.viewport(), &again);
-    QCOMPARE(item->getFocusFlag(), int(GraphicsText::FocusObject));
+    QCOMPARE(item->getFocusFlag(), int(TextObjectConstants::FocusObject));
     canvas.touchDrag(from, from + QPoint(80, 40));
     QCOMPARE(item->scenePos(), place);
     QCOMPARE(canvas.stack.count(), 1);
@@ -449,7 +449,7 @@ void tst_taptable::cancelledTapChoosesNothing()
     canvas.open({makeRecord("abc")});
     GraphicsText* item = canvas.text(1);
     QSignalSpy keyboard(item, &GraphicsText::signalNotifySceneCurrentObjectInEditMode);
-    for (const int flag : {int(GraphicsText::FocusNone), int(GraphicsText::FocusObject)}) {
+    for (const int flag : {int(TextObjectConstants::FocusNone), int(TextObjectConstants::FocusObject)}) {
         QCOMPARE(item->getFocusFlag(), flag);
         canvas.press(canvas.pointOn(1));
         keyboard.clear();
@@ -460,7 +460,7 @@ void tst_taptable::cancelledTapChoosesNothing()
         QCOMPARE(canvas.scene->mouseGrabberItem(), nullptr);
         canvas.touchTap(canvas.pointOn(1));
     }
-    QCOMPARE(item->getFocusFlag(), int(GraphicsText::FocusEdit));
+    QCOMPARE(item->getFocusFlag(), int(TextObjectConstants::FocusEdit));
     QVERIFY(keyboard.count() > 0);
 }
 
@@ -478,7 +478,7 @@ void tst_taptable::frameIsNoHandle()
         canvas.touchDrag(above, above + QPoint(80, -60));
         QCOMPARE(item->scenePos(), QPointF(300.0, 200.0));
         QCOMPARE(canvas.stack.count(), 0);
-        QCOMPARE(item->getFocusFlag(), int(GraphicsText::FocusNone));
+        QCOMPARE(item->getFocusFlag(), int(TextObjectConstants::FocusNone));
     }
 }
 
@@ -502,8 +502,8 @@ void tst_taptable::secondFingerOnTheCanvas()
     QTest::touchEvent(on, m_device).move(1, from + QPoint(60, 0), on);
     QTest::touchEvent(on, m_device).release(1, from + QPoint(60, 0), on);
     QCOMPARE(canvas.text(1)->scenePos(), QPointF(360.0, 200.0));
-    QCOMPARE(canvas.text(1)->getFocusFlag(), int(GraphicsText::FocusObject));
-    QCOMPARE(canvas.text(2)->getFocusFlag(), int(GraphicsText::FocusNone));
+    QCOMPARE(canvas.text(1)->getFocusFlag(), int(TextObjectConstants::FocusObject));
+    QCOMPARE(canvas.text(2)->getFocusFlag(), int(TextObjectConstants::FocusNone));
     QCOMPARE(canvas.text(2)->scenePos(), QPointF(300.0, 450.0));
     QCOMPARE(canvas.stack.count(), 1);
 }
@@ -544,9 +544,9 @@ void tst_taptable::fingerOnAButtonBeforeTheCanvas()
     QTest::touchEvent(&canvas.window, m_device).stationary(1).press(2, canvas.pointOn(1), on);
     QTest::touchEvent(&canvas.window, m_device).stationary(1).release(2, canvas.pointOn(1), on);
     QTest::touchEvent(&canvas.window, m_device).release(1, middle, canvas.button);
-    QCOMPARE(canvas.text(1)->getFocusFlag(), int(GraphicsText::FocusNone));
+    QCOMPARE(canvas.text(1)->getFocusFlag(), int(TextObjectConstants::FocusNone));
     canvas.touchTap(canvas.pointOn(1));
-    QCOMPARE(canvas.text(1)->getFocusFlag(), int(GraphicsText::FocusObject));
+    QCOMPARE(canvas.text(1)->getFocusFlag(), int(TextObjectConstants::FocusObject));
 }
 
 void tst_taptable::rangeTable_data()
@@ -573,7 +573,7 @@ void tst_taptable::rangeTable()
     QFETCH(int, side);
     TouchCanvas canvas(m_device);
     canvas.open({makeRecord("abc")});
-    QCOMPARE(canvas.text(1)->touchEditor().itemIsOutOfRange(corner), side);
+    QCOMPARE(int(TextPlacement::itemIsOutOfRange(corner, canvas.text(1)->layoutRect().size())), side);
 }
 
 QTEST_MAIN(tst_taptable)

@@ -1,8 +1,8 @@
 #include "TextPair.h"
 
+#include "canvas/CaretGeometry.h"
 #include "canvas/CharacterFormat.h"
 #include "canvas/StyleDocument.h"
-#include "canvas/TextPainter.h"
 
 #include <QClipboard>
 #include <QGraphicsDropShadowEffect>
@@ -100,7 +100,6 @@ void tst_textpainting::marginsFollowTheTallestLine()
     double tallest = 0.0;
     for (QTextBlock block = pair.child->document()->begin(); block.isValid(); block = block.next())
         tallest = qMax(tallest, block.layout()->lineAt(0).height());
-    QCOMPARE(GraphicsText::BOUNDING_RECT_EXPAND_REGION, 0.6 * tallest);
     for (QTextBlock block = pair.child->document()->begin(); block.isValid(); block = block.next()) {
         QCOMPARE(block.blockFormat().leftMargin(), 0.3 * tallest);
         QCOMPARE(block.blockFormat().rightMargin(), 0.3 * tallest);
@@ -237,7 +236,7 @@ void tst_textpainting::paintedInAViewInsideAWindow()
 void tst_textpainting::caretPoints()
 {
     Pair pair(makeRecord("ab\ncd\n"));
-    CaretGeometry& carets = pair.child->textPainter().carets();
+    CaretGeometry& carets = pair.child->carets();
     QLineF line;
     QPointF point;
     int block = -7;
