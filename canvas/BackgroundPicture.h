@@ -1,5 +1,3 @@
-// The picture in a background file. Whoever shows the same file at the same time, or another one with the
-// same bytes, as a pasted title does, shares the decoded pixels; nothing is kept for later.
 #pragma once
 
 #include <QImage>
@@ -8,6 +6,8 @@
 #include <memory>
 #include <sys/stat.h>
 
+// The picture in a background file. Objects that show the same file at the same time, or one with the same
+// bytes, as a pasted title does, share the decoded pixels; nothing is kept for later.
 class BackgroundPicture
 {
 public:
@@ -21,7 +21,7 @@ public:
     };
     static Decoded decode(const QString& path);
     static std::shared_ptr<const BackgroundPicture> load(const Decoded& decoded);
-    // Null when nobody has a picture of the file or one with the same bytes. GUI thread only.
+    // Null if no picture of the file, or of one with the same bytes, is in use. GUI thread only.
     static std::shared_ptr<const BackgroundPicture> find(const QString& path);
     // Decodes into the format that needs no conversion for a pixmap; null when that cannot be done. Any
     // thread.

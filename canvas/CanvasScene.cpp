@@ -242,7 +242,7 @@ void CanvasScene::addCGraphicsTextItem()
     } else if (itemIsSelectionMode()) {
         clearItemsSelectionMode();
     }
-    slotDeleteEmptyItems(); // also one that nobody sees any more: it would count among the four
+    slotDeleteEmptyItems(); // also a hidden one: it would count among the four
     if (m_texts->listed().size() >= MAX_TEXT_OBJECTS) {
         Q_EMIT signalTextInserted();
         Q_EMIT signalNewTextInsertedFailed();

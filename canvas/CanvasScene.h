@@ -74,7 +74,7 @@ public:
     void clearItemsSelectionAndFocus();
     void disableTextPropertyArea() { Q_EMIT signalSceneNotifyIfExistSelectedObject(false); }
 
-    // Deleted objects stay in the scene hidden; every loop over items goes through here.
+    // Deleted objects stay in the scene hidden; every loop over items uses this list.
     QList<QGraphicsItem*> enableItems() const;
     // The children of the objects shown.
     QList<GraphicsText*> getTextItemList() const;
@@ -108,8 +108,8 @@ public:
     void generateThumbnail(QSize size, const QString& path);
     // The copy of the title shown, or null; owned by the scene.
     const Archive* archive() const;
-    // A folder lies elsewhere now: all that is still to be saved in it goes there. If it is that of the title
-    // shown, what is being typed is taken over.
+    // Call when a folder was renamed: what is still to be saved in it is saved there. If it is that of the
+    // title shown, what is being typed is taken over.
     void folderRenamed(const QString& before, const QString& after);
 
 public Q_SLOTS:

@@ -24,7 +24,7 @@ public:
     // Format of a character for layout. Its foreground has alpha 0: the document only places characters.
     static QTextCharFormat layoutFormat(const TextStyle& style, double ratio);
 
-    // A colour of a record; black where the text is none.
+    // A colour of a record; black if the text is not a colour.
     static QColor color(const std::string& text);
 
     // Width of the outline pen in raster pixels; a pen of width 0 draws a hairline.

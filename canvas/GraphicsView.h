@@ -16,7 +16,7 @@ class GraphicsView : public QGraphicsView
 public:
     explicit GraphicsView(QGraphicsScene* scene, QWidget* parent = nullptr);
 
-    // Cancels the touch that goes on, if there is one.
+    // Cancels the current touch, if there is one.
     void cancelTouch() { m_finger.cancel(); }
 
 Q_SIGNALS:

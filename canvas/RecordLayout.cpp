@@ -39,8 +39,8 @@ RecordLayout::RecordLayout(const TextObjectParts& parts) : m_parts(parts)
 {
 }
 
-// With the margins of the text that comes, the document need not be laid out again for them. The tallest font
-// tells them unless a line mixes fonts.
+// Estimates the margins from the tallest font, so that the document need not be laid out again for them. Only
+// a line of mixed fonts may be taller.
 double RecordLayout::expectedMargin() const
 {
     double tallest = 0.0;

@@ -52,8 +52,8 @@ SaveOutage* SaveOutage::instance()
 
 SaveOutage::SaveOutage()
 {
-    mTimer.setInterval(RETRY_INTERVAL);
-    connect(&mTimer, &QTimer::timeout, this, &SaveOutage::retryLater);
+    m_timer.setInterval(RETRY_INTERVAL);
+    connect(&m_timer, &QTimer::timeout, this, &SaveOutage::retryLater);
     const auto listener = [this] {
         QMetaObject::invokeMethod(this, &SaveOutage::begin, Qt::QueuedConnection);
     };
@@ -63,15 +63,15 @@ SaveOutage::SaveOutage()
 
 void SaveOutage::begin()
 {
-    mHasSyncFailed = mHasSyncFailed || FileSyncQueue::hasFailed();
+    m_hasSyncFailed = m_hasSyncFailed || FileSyncQueue::hasFailed();
     if (isOver())
         return;
     // An ordinary save may have ended the last outage before this one began.
     const unsigned long outage = RefusedWrites::outages();
-    if (std::exchange(mOutage, outage) != outage && !mHasSyncFailed)
+    if (std::exchange(m_outage, outage) != outage && !m_hasSyncFailed)
         end();
-    if (!mTimer.isActive())
-        mTimer.start();
+    if (!m_timer.isActive())
+        m_timer.start();
     logRefused();
     tell(FoldersAway::Pardoned);
 }
@@ -94,42 +94,42 @@ void SaveOutage::retryLater()
 
 bool SaveOutage::isOver()
 {
-    return RefusedWrites::isEmpty() && (!mHasSyncFailed || FileSyncQueue::unsynced().empty());
+    return RefusedWrites::isEmpty() && (!m_hasSyncFailed || FileSyncQueue::unsynced().empty());
 }
 
 void SaveOutage::end()
 {
-    if (mIsTold)
+    if (m_isTold)
         log("the disk takes again what is saved");
-    mTimer.stop();
-    mLogged.clear();
-    mIsTold = false;
-    mHasSyncFailed = false;
+    m_timer.stop();
+    m_logged.clear();
+    m_isTold = false;
+    m_hasSyncFailed = false;
 }
 
 void SaveOutage::tell(FoldersAway foldersAway)
 {
     MessageBoxController* const messages = MessageBoxController::getInstance();
-    if (mIsTold || !messages)
+    if (m_isTold || !messages)
         return;
     const std::vector<RefusedWrites::File> files = RefusedWrites::files();
-    if (foldersAway == FoldersAway::Pardoned && !mHasSyncFailed &&
+    if (foldersAway == FoldersAway::Pardoned && !m_hasSyncFailed &&
         std::none_of(files.begin(), files.end(), hasFolder))
         return;
-    mIsTold = true;
+    m_isTold = true;
     messages->postMessage(MessageDef::MESSAGE_DISK_FULL_ON_CREATE, tr("File"));
 }
 
 void SaveOutage::logRefused()
 {
     for (const RefusedWrites::File& file : RefusedWrites::files()) {
-        if (mLogged.insert(file.path).second)
+        if (m_logged.insert(file.path).second)
             log("cannot write " + file.path + ": " + std::strerror(file.error));
     }
-    if (!mHasSyncFailed)
+    if (!m_hasSyncFailed)
         return;
     for (const std::string& path : FileSyncQueue::unsynced()) {
-        if (mLogged.insert(path).second)
+        if (m_logged.insert(path).second)
             log("cannot sync " + path);
     }
 }

@@ -1,9 +1,3 @@
-// The time in which the disk refuses what is saved: tells the operator once, tries again every few seconds
-// and notes in the log what is concerned. The files themselves are kept by RefusedWrites, and by
-// FileSyncQueue where the disk failed after they were in their place.
-//
-// One object for the process, made in the GUI thread by the first who saves; never destroyed. GUI thread
-// only.
 #pragma once
 
 #include <QObject>
@@ -12,6 +6,11 @@
 #include <string>
 #include <vector>
 
+// The time in which the disk refuses what is saved. Reports it to the operator once, tries again every few
+// seconds and logs which files are concerned. The files themselves are kept by RefusedWrites, and by
+// FileSyncQueue where the disk failed after they were in their place.
+//
+// One object for the process, made in the GUI thread when it is first used; never destroyed. GUI thread only.
 class SaveOutage : public QObject
 {
     Q_OBJECT
@@ -37,9 +36,9 @@ private:
     void tell(FoldersAway foldersAway);
     void logRefused();
 
-    QTimer mTimer;
-    std::set<std::string> mLogged; // paths
-    unsigned long mOutage = 0;     // the last one that RefusedWrites counted
-    bool mIsTold = false;
-    bool mHasSyncFailed = false;
+    QTimer m_timer;
+    std::set<std::string> m_logged; // paths
+    unsigned long m_outage = 0;     // the last one that RefusedWrites counted
+    bool m_isTold = false;
+    bool m_hasSyncFailed = false;
 };

@@ -40,12 +40,12 @@ public:
     void makeSmallPicture();
 
     bool isEditFinish() const;
-    // Blocks until the pictures are written, or nothing has come of them for a long time: the disk hangs, and
-    // they are written when it goes on. Returns isEditFinish().
+    // Blocks until the pictures are written, or none has been written for a long time because the disk hangs;
+    // they are written when it works again. Returns isEditFinish().
     bool waitForPictures() const;
 
-    // A folder lies elsewhere now: all that is still to be saved in it goes there. Returns whether it is that
-    // of the title shown.
+    // Call when a folder was renamed: what is still to be saved in it is saved there. Returns whether it is
+    // the folder of the title shown.
     bool folderRenamed(const QString& before, const QString& after);
 
 private:

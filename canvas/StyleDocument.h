@@ -20,7 +20,7 @@ public:
 
     TText& current() { return m_current; }
     const TText& current() const { return m_current; }
-    // One style: what the next character takes while there are none.
+    // One style, which the next character takes while the record has no characters.
     TText& lastAlpha() { return m_lastAlpha; }
     const TText& lastAlpha() const { return m_lastAlpha; }
     // Takes effect for the next typed character while nextInsertSaved() holds.
@@ -39,7 +39,7 @@ public:
 
     void setCurrent(const TText& record);
     void insert(int position, std::vector<std::unique_ptr<TextStyle>> styles);
-    // The style of the only character becomes last alpha before it goes; true in that case.
+    // Returns whether it was the only character, whose style is then kept as last alpha.
     bool remove(int position);
 
     // Style of a character about to be inserted, from its neighbours. startOfLine: the characters behind it

@@ -22,8 +22,8 @@ public:
     // The same for an object of the size at the position.
     static Side itemIsOutOfRange(QPointF position, QSizeF size);
     Side itemIsOutOfRange(QPointF position) const { return itemIsOutOfRange(position, area().size()); }
-    // Places the object at the limit of that side. Returns the point from which a finger that goes on drags
-    // the object again.
+    // Places the object at the limit of that side. Returns the point from which the finger drags the
+    // object on.
     QPointF adjustItemPos(Side side);
 
     bool isPair() const;

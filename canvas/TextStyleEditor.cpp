@@ -139,7 +139,7 @@ int TextStyleEditor::cutOffCharsBeyondMaxNum(int position, int added)
     const qsizetype characters = text.size() - text.count(QLatin1Char('\n'));
     if (characters <= CHARACTER_LIMIT)
         return added;
-    // Only what has just come may go, from the cursor backwards.
+    // Only what was just inserted may be removed, from the cursor backwards.
     QTextCursor cursor = m_surface.selection();
     const int end = cursor.position();
     int begin = end;

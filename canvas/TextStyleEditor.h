@@ -57,7 +57,7 @@ private:
     // Substitutes a missing family and reports it.
     void ensureFamily(TextStyle& style);
     int cutOffCharsBeyondMaxNum(int position, int added);
-    // Leaves out of a reported change what is as it was.
+    // Leaves out of a reported change the characters that did not change.
     void trimUnchanged(int& position, int& removed, int& added) const;
     void replaceCharacters(int position, int removed, int added);
     void charsAddedChange(int position, int added);

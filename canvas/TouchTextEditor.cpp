@@ -385,7 +385,7 @@ void TouchTextEditor::getPressedPos(QPointF point)
     QTextBlock tapped = m_document.begin();
     while (!reaches(tapped) && tapped.next().isValid())
         tapped = tapped.next();
-    // Below the text the caret goes to the last line, in the column of the first.
+    // A tap below the text places the caret in the last line, in the column of the first.
     const bool below = !reaches(tapped);
     const QTextBlock measured = below ? m_document.begin() : tapped;
     if (measured.layout()->lineCount() == 0)

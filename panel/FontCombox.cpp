@@ -115,7 +115,7 @@ void FontCombox::addSpecialDefaultFont()
         m_imported.append(family);
 }
 
-// A pipe would block and a monster would fill the memory; the font system refuses what is no font. Notices
+// A pipe would block and a monster would fill the memory; the font system refuses what is not a font. Notices
 // name files of the folder.
 void FontCombox::registerFontFile(const QString& path)
 {

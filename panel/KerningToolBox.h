@@ -22,7 +22,7 @@ public:
 
     explicit KerningToolBox(QWidget* parent);
 
-    // A level, or -1 for a spacing that is none of them. Shown once the box is enabled.
+    // A level, or -1 for a spacing without a level. Shown once the box is enabled.
     void setKerning(int level) { m_level = level; }
     int getKerning() const { return m_level; }
 

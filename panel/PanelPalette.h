@@ -32,8 +32,8 @@ public:
     void forget();
 
     void cancel();
-    // Cancels the palette unless the change that goes on is its own: a change by anything else would take the
-    // previewed colour over.
+    // Cancels the palette unless it makes the current change itself: any other change would keep the
+    // previewed colour.
     void cancelUnlessAnswering();
 
     // While one lives, changes are those of the palette.

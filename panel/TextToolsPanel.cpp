@@ -199,10 +199,10 @@ void TextToolsPanel::slotAbsoluteShowCanvasMenu(bool shown)
     m_boxes.size->clearFocusOfSizeBoxLineEdit(shown);
 }
 
-// The change path: what the operator does in a tool box goes into the working copy and to the canvas
+// The change path: what the operator does in a tool box changes the working copy and is sent to the canvas
 
-// Every change goes this way. An empty log line is left out. The copy lives during the call only, so that
-// whoever shows the answer may replace the working copy meanwhile.
+// Makes a change of any kind. An empty log line is left out. A copy is sent, since the answer may replace the
+// working copy meanwhile.
 template <typename Edit>
 void TextToolsPanel::change(const std::wstring& log, int id, int undoFlag, Edit edit)
 {

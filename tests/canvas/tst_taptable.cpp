@@ -2,8 +2,6 @@
 
 #include <QTouchEvent>
 
-#include "canvas/TextPlacement.h"
-
 // What one finger does to the text objects of a canvas, as touches that pass the application's gate: select,
 // edit, drag, and that a second finger changes nothing.
 class tst_taptable : public QObject
@@ -38,8 +36,6 @@ private Q_SLOTS:
     void secondFingerOnTheCanvas();
     void secondFingerOnAButton();
     void fingerOnAButtonBeforeTheCanvas();
-    void rangeTable_data();
-    void rangeTable();
 
 private:
     QPointingDevice* m_device = nullptr;
@@ -547,33 +543,6 @@ void tst_taptable::fingerOnAButtonBeforeTheCanvas()
     QCOMPARE(canvas.text(1)->getFocusFlag(), int(TextObjectConstants::FocusNone));
     canvas.touchTap(canvas.pointOn(1));
     QCOMPARE(canvas.text(1)->getFocusFlag(), int(TextObjectConstants::FocusObject));
-}
-
-void tst_taptable::rangeTable_data()
-{
-    QTest::addColumn<QPointF>("corner");
-    QTest::addColumn<int>("side");
-    // Offsets from the four limits; beyond two limits the vertical one counts.
-    QTest::newRow("inside") << QPointF(10.0, 10.0) << 0;
-    QTest::newRow("far left") << QPointF(-5000.0, 10.0) << 1;
-    QTest::newRow("far right") << QPointF(5000.0, 10.0) << 2;
-    QTest::newRow("far up") << QPointF(10.0, -5000.0) << 3;
-    QTest::newRow("far down") << QPointF(10.0, 5000.0) << 4;
-    QTest::newRow("left and up") << QPointF(-5000.0, -5000.0) << 3;
-    QTest::newRow("right and down") << QPointF(5000.0, 5000.0) << 4;
-    QTest::newRow("right edge") << QPointF(1180.0, 10.0) << 0;
-    QTest::newRow("beyond the right edge") << QPointF(1180.5, 10.0) << 2;
-    QTest::newRow("lower edge") << QPointF(10.0, 620.0) << 0;
-    QTest::newRow("beyond the lower edge") << QPointF(10.0, 620.5) << 4;
-}
-
-void tst_taptable::rangeTable()
-{
-    QFETCH(QPointF, corner);
-    QFETCH(int, side);
-    TouchCanvas canvas(m_device);
-    canvas.open({makeRecord("abc")});
-    QCOMPARE(int(TextPlacement::itemIsOutOfRange(corner, canvas.text(1)->layoutRect().size())), side);
 }
 
 QTEST_MAIN(tst_taptable)
