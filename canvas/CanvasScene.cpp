@@ -18,6 +18,7 @@
 #include "document/FontStyle.h"
 #include "document/TText.h"
 #include "support/LogManager.h"
+#include "touchui/FieldName.h"
 #include "touchui/KSInputContext.h"
 
 #include <QAction>
@@ -778,7 +779,7 @@ void CanvasScene::openKeyboardForItem(GraphicsText* item)
 
 QString CanvasScene::getDataInfo(const SubCommonDefine::tagSoftKeyBoardInitData& data) const
 {
-    return SoftKeyboardField::getDataInfo(data);
+    return FieldName::write(data);
 }
 
 QString CanvasScene::getNewTextDataInfo(const QString& text) const

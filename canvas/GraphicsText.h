@@ -3,6 +3,7 @@
 #include "canvas/InputLanguageFonts.h"
 #include "canvas/TextObjectConstants.h"
 #include "messaging/services/SystemSetupDef.h"
+#include "touchui/CanvasTextField.h"
 
 #include <QGraphicsTextItem>
 #include <QPointF>
@@ -33,7 +34,7 @@ class GraphicsText : public QGraphicsTextItem, public TextObjectConstants, publi
 {
     Q_OBJECT
 public:
-    enum { Type = UserType + 10 };
+    enum { Type = CanvasTextField::ITEM_TYPE };
 
     // A child that shows a copy of the record (null: a default record without characters). An id that is not
     // 0 becomes the id of the copy.
