@@ -1,15 +1,12 @@
 #include "library/TemplateScrollArea.h"
 
-#include "touchui/FlickMotion.h"
 #include "touchui/KSScrollBar.h"
-#include "touchui/TouchClock.h"
 #include "touchui/TouchEventButton.h"
 
 #include <QApplication>
 #include <QMouseEvent>
 #include <QPushButton>
 #include <QScrollBar>
-#include <QTimerEvent>
 #include <QTouchEvent>
 #include <QWheelEvent>
 
@@ -17,8 +14,6 @@ const QSize TemplateScrollArea::TOUCH_RECT_SIZE(50, 50);
 
 namespace
 {
-
-constexpr FlickMotion::Rules RULES = FlickMotion::templateGrid();
 
 // Narrower than in other lists: four columns and the bar fill the area.
 const char SCROLL_BAR_STYLE[] =
@@ -43,6 +38,7 @@ TemplateScrollArea::TemplateScrollArea(QWidget* parent) : QScrollArea(parent)
     setHorizontalScrollBarPolicy(Qt::ScrollBarAlwaysOff);
     setFocusPolicy(Qt::NoFocus);
     connect(&mFinger, &OneFinger::cancelled, this, &TemplateScrollArea::rest);
+    connect(&mFlicker, &Flicker::ticked, this, &TemplateScrollArea::getDistance);
 }
 
 void TemplateScrollArea::initTouch()
@@ -53,23 +49,10 @@ void TemplateScrollArea::initTouch()
     verticalScrollBar()->installEventFilter(this);
 }
 
-bool TemplateScrollArea::isFlickEnd() const
-{
-    return FlickMotion::isFlickEnd(RULES, mStartPoint, mEndPoint);
-}
-
-void TemplateScrollArea::stopFlick()
-{
-    if (mTimerId != 0)
-        TouchClock::instance().stop(this, mTimerId);
-    mTimerId = 0;
-    mFlick = false;
-}
-
 // Nothing was tapped, and nothing goes on moving.
 void TemplateScrollArea::rest()
 {
-    stopFlick();
+    mFlicker.cancel();
     mPressedButton.clear();
 }
 
@@ -107,7 +90,7 @@ bool TemplateScrollArea::eventFilter(QObject* watched, QEvent* event)
 
 bool TemplateScrollArea::handleTouch(QObject* watched, QTouchEvent* event)
 {
-    const bool wasFlicking = mFlick;
+    const bool wasFlicking = mFlicker.isGliding();
     if (mFinger.follow(event, watched) == OneFinger::Step::None)
         return true;
     onTouchEvent();
@@ -122,34 +105,15 @@ void TemplateScrollArea::onTouchEvent()
 {
     const QPoint position = mFinger.positionIn(this).toPoint();
     if (mFinger.step() == OneFinger::Step::Begin) {
-        stopFlick();
+        mFlicker.begin(position);
         mPressedButton.clear();
-        mStartPoint = mEndPoint = position;
-        mFirstMove = true;
     } else if (!rect().contains(position)) {
         return;
     } else if (mFinger.step() == OneFinger::Step::Move) {
-        moveTo(position);
+        mFlicker.follow(position);
     } else {
-        liftAt(position);
+        mFlicker.lift(position);
     }
-}
-
-void TemplateScrollArea::moveTo(const QPoint& position)
-{
-    if (mFirstMove)
-        mStartPoint = position;
-    mFirstMove = false;
-    setEndPoint(position);
-}
-
-void TemplateScrollArea::liftAt(const QPoint& position)
-{
-    setEndPoint(position);
-    if (isFlickEnd())
-        stopFlick();
-    else
-        mFlick = true;
 }
 
 void TemplateScrollArea::onTranslateTouchEventToMouse(QObject* watched)
@@ -158,7 +122,6 @@ void TemplateScrollArea::onTranslateTouchEventToMouse(QObject* watched)
         mPressPoint = mFinger.position().toPoint();
         mMoved = false;
         mPressedButton = qobject_cast<QPushButton*>(watched);
-        mValueAtStart = verticalScrollBar()->value();
         sendPressToViewport(mPressPoint);
         return;
     }
@@ -178,37 +141,10 @@ void TemplateScrollArea::sendPressToViewport(const QPoint& global)
     QCoreApplication::sendEvent(viewport(), &press);
 }
 
-void TemplateScrollArea::setEndPoint(const QPoint& point)
-{
-    mEndPoint = point;
-    if (!isFlickEnd() && mTimerId == 0) {
-        mValueAtStart = verticalScrollBar()->value();
-        mTimerId = TouchClock::instance().start(this, TOUCH_TIMER_TIME);
-    }
-}
-
-void TemplateScrollArea::timerEvent(QTimerEvent* event)
-{
-    if (event->timerId() != mTimerId) {
-        QScrollArea::timerEvent(event);
-        return;
-    }
-    if (isFlickEnd())
-        stopFlick();
-    else
-        getDistance();
-    const QScrollBar* bar = verticalScrollBar();
-    if (FlickMotion::isAtLimit(bar->value(), bar->minimum(), bar->maximum()))
-        stopFlick();
-}
-
-// One step of the start point towards the end point, and of the content by half of what lay between.
+// One step of the content, by half of the way that is left.
 void TemplateScrollArea::getDistance()
 {
-    const FlickMotion::Step step = mFlick ? FlickMotion::flickStep(RULES, mStartPoint, mEndPoint)
-                                          : FlickMotion::dragStep(RULES, mStartPoint, mEndPoint);
-    mStartPoint = step.start.toPoint();
-    changeScrollBarValue(step.scroll);
+    changeScrollBarValue(FlickMotion::pixels(mFlicker.advance()).y());
 }
 
 void TemplateScrollArea::changeScrollBarValue(int distance)

@@ -11,7 +11,6 @@
 #include <QMouseEvent>
 #include <QPaintEvent>
 #include <QPainter>
-#include <QTimerEvent>
 #include <QTouchEvent>
 
 namespace
@@ -125,9 +124,7 @@ bool KSScrollViewerWidget::isOtherItemTouchWhenGraping(QObject* object, QEvent* 
 // Nothing is tapped or held, nothing goes on moving, and what is lifted returns to its place.
 void KSScrollViewerWidget::rest()
 {
-    m_flick.letGo();
-    m_flick.rest();
-    stopFlick();
+    m_flicker.cancel();
     m_press.stopTimers();
     m_press.drop();
     m_press.moved = false;
@@ -153,114 +150,31 @@ bool KSScrollViewerWidget::onTouchEvent(QObject*, QTouchEvent*)
 {
     const QPointF position = m_finger.positionIn(this);
     if (m_finger.step() == OneFinger::Step::Begin) {
-        if (m_isTake)
-            return false;
-        stopFlick();
-        setFlickAbility(true);
-        m_flick.begin(position);
-        setStartPoint(position);
-        setEndPoint(position);
-        return true;
+        if (!m_isTake)
+            m_flicker.begin(position);
+        return !m_isTake;
     }
-    if (!m_flick.isFollowing())
+    if (!m_flicker.isFollowing())
         return !m_isTake;
     if (m_finger.step() == OneFinger::Step::Move) {
-        m_flick.follow(position);
-        setEndPoint(position);
+        m_flicker.follow(position);
         return true;
     }
-    m_flick.letGo();
-    setEndPoint(position);
-    if (flickAbility() && !isFlickEnd()) {
+    m_flicker.lift(position);
+    if (flickAbility() && !isFlickEnd())
         m_savedMinitrim = std::exchange(m_minitrim, false);
-        if (!m_flick.isBounded()) {
-            setAutoFlick(true);
-            return true;
-        }
-    }
-    stopFlick();
     return true;
 }
 
-void KSScrollViewerWidget::setStartPoint(const QPointF& point)
+void KSScrollViewerWidget::motionEnded(Flicker::End end)
 {
-    m_flick.setStart(point);
-}
-
-void KSScrollViewerWidget::setEndPoint(const QPointF& point)
-{
-    if (!flickAbility())
-        return;
-    m_flick.setEnd(point);
-    if (isFlickEnd() || m_flick.isRunning())
-        return;
-    m_scrollValue = verticalScrollBar()->value();
-    m_flick.startTimer();
-}
-
-bool KSScrollViewerWidget::isFlickEnd() const
-{
-    return m_flick.isEnd();
-}
-
-bool KSScrollViewerWidget::isMove() const
-{
-    return m_flick.isMove();
-}
-
-bool KSScrollViewerWidget::hasFlicked() const
-{
-    return m_flick.hasFlicked();
-}
-
-void KSScrollViewerWidget::stopFlick()
-{
-    m_flick.stopTimer();
-    setAutoFlick(false);
-}
-
-void KSScrollViewerWidget::setAutoFlick(bool autoFlick)
-{
-    m_flick.setAuto(autoFlick);
-}
-
-bool KSScrollViewerWidget::isAutoFilck() const
-{
-    return m_flick.isAuto();
-}
-
-bool KSScrollViewerWidget::flickAbility() const
-{
-    return m_flick.isAble();
-}
-
-void KSScrollViewerWidget::setFlickAbility(bool ability)
-{
-    m_flick.setAble(ability);
-    if (!ability)
-        stopFlick();
-}
-
-void KSScrollViewerWidget::timerEvent(QTimerEvent* event)
-{
-    if (!m_flick.isTimer(event->timerId())) {
-        QScrollArea::timerEvent(event);
-        return;
-    }
-    if (!isFlickEnd()) {
-        changeScrollBarValue(static_cast<int>(getDistance().y()));
-    } else {
-        if (!isAutoFilck())
-            m_minitrim = m_savedMinitrim;
-        stopFlick();
-    }
-    if (FlickMotion::isAtLimit(verticalScrollBar()->value(), m_bar->minimum(), m_bar->maximum()))
-        stopFlick();
+    if (end == Flicker::End::Rest)
+        m_minitrim = m_savedMinitrim;
 }
 
 QPointF KSScrollViewerWidget::getDistance()
 {
-    return m_flick.advance(dragBounds());
+    return m_flicker.advance(dragBounds());
 }
 
 std::optional<FlickMotion::DragBounds> KSScrollViewerWidget::dragBounds() const
@@ -556,7 +470,7 @@ void KSScrollViewerWidget::startDrag()
     m_press.stopTimers();
     // The finger moves the item now and not the list.
     setFlickAbility(false);
-    m_flick.rest();
+    m_flicker.rest();
     Q_EMIT signalDragOneItem(item, m_press.index, this);
     QWidget* parent = s_mainWnd ? s_mainWnd.data() : window();
     const QPoint position = parent->mapFromGlobal(mapToGlobal(m_press.press)) - m_press.positionInItem;

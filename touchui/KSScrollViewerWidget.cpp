@@ -38,7 +38,6 @@ QString KSScrollViewerWidget::s_scrollBarStyle =
 KSScrollViewerWidget::KSScrollViewerWidget(QWidget* parent)
     : QScrollArea(parent)
     , m_board(new ScrollViewerBoard(this))
-    , m_flick(this)
     , m_drag(std::make_unique<ScrollViewerDrag>(*m_board))
 {
     setFrameShape(QFrame::NoFrame);
@@ -53,6 +52,10 @@ KSScrollViewerWidget::KSScrollViewerWidget(QWidget* parent)
     m_press.hold.setSingleShot(true);
     m_press.popup.setSingleShot(true);
     connect(&m_finger, &OneFinger::cancelled, this, &KSScrollViewerWidget::rest);
+    connect(&m_flicker, &Flicker::started, this, [this] { m_scrollValue = verticalScrollBar()->value(); });
+    connect(&m_flicker, &Flicker::ticked, this,
+            [this] { changeScrollBarValue(static_cast<int>(getDistance().y())); });
+    connect(&m_flicker, &Flicker::ended, this, &KSScrollViewerWidget::motionEnded);
     connect(&m_press.hold, &TouchTimer::timeout, this, &KSScrollViewerWidget::slotHandleMenuTimer);
     connect(&m_press.popup, &TouchTimer::timeout, this, &KSScrollViewerWidget::slotShowPopupItem);
     connect(&m_drag->edgeTimer, &TouchTimer::timeout, this, &KSScrollViewerWidget::slotHandleMoveTimer);

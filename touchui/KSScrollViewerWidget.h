@@ -1,8 +1,8 @@
 #pragma once
 
+#include "touchui/Flicker.h"
 #include "touchui/KSBaseItemWidget.h"
 #include "touchui/OneFinger.h"
-#include "touchui/ScrollViewerFlick.h"
 #include "touchui/ScrollViewerPress.h"
 #include "touchui/ScrollViewerRow.h"
 
@@ -90,7 +90,7 @@ public:
     // The widget that floats under the finger; null when nothing is lifted.
     virtual KSBaseItemWidget* getMoveItem() const;
     // Switched off, the list does not follow the finger that is down; the next touch switches it on.
-    virtual void setFlickAbility(bool ability);
+    virtual void setFlickAbility(bool ability) { m_flicker.setAble(ability); }
     // Presses beside it, in widget coordinates, select nothing.
     virtual void setHEffectiveArea(int left, int width);
     virtual void onTranslateTouchEventToMouse(QObject* object, QTouchEvent* event);
@@ -101,15 +101,15 @@ public:
     virtual bool onTouchEvent(QObject* object, QTouchEvent* event);
     // One tick: how far the contents move.
     virtual QPointF getDistance();
-    virtual void setAutoFlick(bool autoFlick);
-    virtual void setStartPoint(const QPointF& point);
-    virtual void setEndPoint(const QPointF& point);
-    virtual bool isFlickEnd() const;
-    virtual bool hasFlicked() const;
-    virtual void stopFlick();
+    virtual void setAutoFlick(bool autoFlick) { m_flicker.setGliding(autoFlick); }
+    virtual void setStartPoint(const QPointF& point) { m_flicker.setStart(point); }
+    virtual void setEndPoint(const QPointF& point) { m_flicker.setEnd(point); }
+    virtual bool isFlickEnd() const { return m_flicker.isEnd(); }
+    virtual bool hasFlicked() const { return m_flicker.hasFlicked(); }
+    virtual void stopFlick() { m_flicker.stop(); }
     // The list runs on after the finger has left.
-    virtual bool isAutoFilck() const;
-    virtual bool flickAbility() const;
+    virtual bool isAutoFilck() const { return m_flicker.isGliding(); }
+    virtual bool flickAbility() const { return m_flicker.isAble(); }
 
     KSBaseItemWidget* getWidgetItem(int index) const;
     // Null when there is no such row or its widget is not made.
@@ -134,7 +134,7 @@ public:
     // Items that are at least partly to be seen; -1 when there are none.
     int firstVisibleItem() const { return m_firstVisible; }
     int lastVisibleItem() const { return m_lastVisible; }
-    bool isMove() const;
+    bool isMove() const { return m_flicker.isMove(); }
     bool isDragging() const;
     // Restarts those timers of press and drag that run.
     void allTimersReset();
@@ -187,7 +187,6 @@ Q_SIGNALS:
     void widgetItemChangeColor(KSBaseItemWidget* item, QPoint pos, KSScrollViewerWidget* scrollArea);
 
 protected:
-    void timerEvent(QTimerEvent* event) override;
     void mousePressEvent(QMouseEvent* event) override;
     void mouseMoveEvent(QMouseEvent* event) override;
     void mouseReleaseEvent(QMouseEvent* event) override;
@@ -230,6 +229,7 @@ private:
     void handleFlickBeginEvent(const QPoint& pos);
     bool isOtherItemTouchWhenGraping(QObject* object, QEvent* event) const;
     void rest();
+    void motionEnded(Flicker::End end);
     void breakTouchOf(KSBaseItemWidget* item);
 
     // Press
@@ -259,7 +259,7 @@ private:
     ScrollViewerBoard* m_board;
     OneFinger m_finger{this};
     KSScrollBar* m_bar = nullptr;
-    ScrollViewerFlick m_flick;
+    Flicker m_flicker{this, FlickMotion::scrollViewer()};
     ScrollViewerPress m_press;
     std::unique_ptr<ScrollViewerDrag> m_drag;
     Qt::Alignment m_barAlignment = Qt::AlignLeft;

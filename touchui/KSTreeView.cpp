@@ -46,6 +46,9 @@ KSTreeView::KSTreeView(QWidget* parent)
     setTextElideMode(Qt::ElideRight);
     connect(&m_finger, &OneFinger::held, this, &KSTreeView::slotHold);
     connect(&m_finger, &OneFinger::cancelled, this, &KSTreeView::rest);
+    connect(&m_flicker, &Flicker::started, this, &KSTreeView::motionStarted);
+    connect(&m_flicker, &Flicker::ticked, this, [this] { changeScrollBarValue(getDistance().y()); });
+    connect(&m_flicker, &Flicker::ended, this, &KSTreeView::showLastRowWhole);
     m_singleShotTimer.setSingleShot(true);
     m_singleShotTimer.setInterval(TOOLTIP_TIME);
     connect(&m_singleShotTimer, &QTimer::timeout, this, &KSTreeView::hideElidedText);
@@ -57,7 +60,6 @@ KSTreeView::KSTreeView(QWidget* parent)
 
 KSTreeView::~KSTreeView()
 {
-    KSTreeView::stopFlick();
     setStyle(nullptr); // ours goes before the widget does
 }
 

@@ -2,11 +2,9 @@
 #include "touchui/KSScrollBar.h"
 #include "touchui/KSTreeModel.h"
 #include "touchui/KSTreeView.h"
-#include "touchui/TouchClock.h"
 
 #include <QApplication>
 #include <QMouseEvent>
-#include <QTimerEvent>
 #include <QTouchEvent>
 
 namespace
@@ -68,7 +66,7 @@ bool KSTreeView::onTouchBeginEvent(QTouchEvent*)
 {
     const QPoint point = fingerPosition();
     const bool brake = isAutoFilck();
-    beginMotion(point);
+    m_flicker.begin(point);
     if (!brake) {
         sendMouse(QEvent::MouseButtonPress, point);
     }
@@ -78,14 +76,14 @@ bool KSTreeView::onTouchBeginEvent(QTouchEvent*)
 bool KSTreeView::onTouchUpdateEvent(QTouchEvent*)
 {
     const QPoint point = fingerPosition();
-    moveMotion(point);
+    m_flicker.follow(point);
     sendMouse(QEvent::MouseMove, point);
     return true;
 }
 
 bool KSTreeView::onTouchEndEvent(QTouchEvent* event)
 {
-    endMotion(fingerPosition());
+    m_flicker.lift(fingerPosition());
     onTranslateTouchEndEventToMouse(event);
     return true;
 }
@@ -98,7 +96,7 @@ void KSTreeView::onTranslateTouchEndEventToMouse(QTouchEvent*)
 // Nothing was tapped, and nothing goes on moving.
 void KSTreeView::rest()
 {
-    stopFlick();
+    m_flicker.cancel();
     cancelPress();
     hideElidedText();
 }
@@ -131,7 +129,7 @@ void KSTreeView::mousePressEvent(QMouseEvent* event)
     }
     if (!m_sendingMouse) {
         const bool brake = isAutoFilck();
-        beginMotion(point);
+        m_flicker.begin(point);
         if (brake) {
             return;
         }
@@ -144,7 +142,7 @@ void KSTreeView::mouseMoveEvent(QMouseEvent* event)
     event->accept();
     const QPoint point = event->position().toPoint();
     if (!m_sendingMouse && (event->buttons() & Qt::LeftButton) && !m_finger.isDown()) {
-        moveMotion(point);
+        m_flicker.follow(point);
     }
     if (m_pressState == NotPressed) {
         return;
@@ -171,7 +169,7 @@ void KSTreeView::mouseReleaseEvent(QMouseEvent* event)
         return;
     }
     if (!m_sendingMouse) {
-        endMotion(point);
+        m_flicker.lift(point);
     }
     const bool isTap = m_pressState == Pressed && !m_moved &&
                        (point - m_pressPoint).manhattanLength() <= QApplication::startDragDistance();
@@ -269,109 +267,17 @@ void KSTreeView::slotHold()
 
 // --- Motion -------------------------------------------------------------------------------------------
 
-void KSTreeView::beginMotion(const QPoint& point)
+void KSTreeView::motionStarted()
 {
-    stopFlick();
-    setStartPoint(point);
-    setEndPoint(point);
-    m_pendingStart = true;
-}
-
-void KSTreeView::moveMotion(const QPoint& point)
-{
-    if (m_pendingStart) {
-        setStartPoint(point);
-        m_pendingStart = false;
-    }
-    setEndPoint(point);
-}
-
-void KSTreeView::endMotion(const QPoint& point)
-{
-    m_pendingStart = false;
-    setEndPoint(point);
-    if (isFlickEnd() || m_flickTimerId == 0) {
-        stopFlick();
-    } else {
-        setAutoFlick(true);
-    }
-}
-
-void KSTreeView::setAutoFlick(bool autoFlick)
-{
-    m_autoFlick = autoFlick;
-}
-
-bool KSTreeView::isAutoFilck()
-{
-    return m_autoFlick;
-}
-
-bool KSTreeView::hasFlicked()
-{
-    return m_hasFlicked;
-}
-
-void KSTreeView::setStartPoint(const QPoint& point)
-{
-    m_startPoint = point;
-    m_hasFlicked = false;
-}
-
-void KSTreeView::setEndPoint(const QPoint& point)
-{
-    m_endPoint = point;
-    if (isFlickEnd() || m_flickTimerId != 0) {
-        return;
-    }
-    m_scrollingFlag = 1;
     setVerticalScrollMode(QAbstractItemView::ScrollPerPixel);
-    m_startScrollValue = verticalScrollBar()->value();
-    m_flickTimerId = TouchClock::instance().start(this, m_rules.interval);
-    m_hasFlicked = true;
     m_finger.stopHold();
     hideElidedText();
 }
 
-bool KSTreeView::isFlickEnd()
+void KSTreeView::showLastRowWhole()
 {
-    return FlickMotion::isFlickEnd(m_rules, m_startPoint, m_endPoint);
-}
-
-void KSTreeView::stopFlick()
-{
-    if (m_flickTimerId != 0) {
-        TouchClock::instance().stop(this, m_flickTimerId);
-        m_flickTimerId = 0;
-    }
-    m_autoFlick = false;
-    m_scrollingFlag = 0;
-}
-
-void KSTreeView::timerEvent(QTimerEvent* event)
-{
-    if (event->timerId() != m_flickTimerId) {
-        QTreeView::timerEvent(event);
-        return;
-    }
-    const QScrollBar* bar = verticalScrollBar();
-    if (!isFlickEnd()) {
-        changeScrollBarValue(getDistance().y());
-    } else if (bar->value() == bar->maximum()) {
-        stopFlick();
+    if (verticalScrollBar()->value() == verticalScrollBar()->maximum()) {
         scrollToBottom();
-    } else if (isAutoFilck()) {
-        stopFlick();
-    } else {
-        m_finger.stopHold(); // the finger rests on a list that it has moved
-    }
-    // A glide dies at either end; there is no way on that would use up what is left of it.
-    if (isAutoFilck() && FlickMotion::isAtLimit(bar->value(), bar->minimum(), bar->maximum())) {
-        const bool atBottom = bar->value() == bar->maximum();
-        stopFlick();
-        if (atBottom) {
-            scrollToBottom();
-        }
     }
 }
 
@@ -380,25 +286,10 @@ QPoint KSTreeView::getDistance()
     return isAutoFilck() ? getFlickDistance() : getDragDistance();
 }
 
-QPoint KSTreeView::getFlickDistance()
-{
-    const FlickMotion::Step step = FlickMotion::flickStep(m_rules, m_startPoint, m_endPoint);
-    m_startPoint = step.start.toPoint();
-    return QPoint(static_cast<int>(step.distance.x()), step.scroll);
-}
-
-QPoint KSTreeView::getDragDistance()
-{
-    const FlickMotion::Step step = FlickMotion::dragStep(m_rules, m_startPoint, m_endPoint);
-    m_startPoint = step.start.toPoint();
-    return QPoint(static_cast<int>(step.distance.x()), step.scroll);
-}
-
 void KSTreeView::changeScrollBarValue(int offset)
 {
     QScrollBar* bar = verticalScrollBar();
-    bar->setValue(FlickMotion::scrolledValue(m_startScrollValue, offset, bar->minimum(), bar->maximum()));
-    m_startScrollValue = bar->value();
+    bar->setValue(FlickMotion::scrolledValue(bar->value(), offset, bar->minimum(), bar->maximum()));
 }
 
 void KSTreeView::hideEvent(QHideEvent* event)
