@@ -8,7 +8,6 @@
 #include <QLineEdit>
 #include <QPixmap>
 
-class QTouchEvent;
 
 class FolderEditor : public QLineEdit
 {
@@ -44,7 +43,6 @@ private:
     // The text, its selection and its caret are QLineEdit's, inside this rectangle.
     QRect getTextRect() const;
     void drawFrame(QPainter& painter) const;
-    bool handleTouch(QTouchEvent* event);
     void sendMouse(QEvent::Type type, const QPointF& globalPosition);
 
     QPixmap mLeft;

@@ -22,12 +22,6 @@ const char SCROLL_BAR_STYLE[] =
     "QScrollBar::add-line:vertical { height: 0px } QScrollBar::sub-line:vertical { height: 0px }"
     "QScrollBar::handle:vertical { min-height: 42px }";
 
-bool isTouch(QEvent::Type type)
-{
-    return type == QEvent::TouchBegin || type == QEvent::TouchUpdate || type == QEvent::TouchEnd ||
-           type == QEvent::TouchCancel;
-}
-
 } // namespace
 
 TemplateScrollArea::TemplateScrollArea(QWidget* parent) : QScrollArea(parent)
@@ -66,7 +60,7 @@ bool TemplateScrollArea::event(QEvent* event)
 {
     if (event->type() == QEvent::Gesture)
         return true;
-    if (isTouch(event->type()))
+    if (OneFinger::isTouch(event))
         return handleTouch(this, static_cast<QTouchEvent*>(event));
     return QScrollArea::event(event);
 }
@@ -82,7 +76,7 @@ bool TemplateScrollArea::eventFilter(QObject* watched, QEvent* event)
     if (watched == viewport() || qobject_cast<QPushButton*>(watched)) {
         if (event->type() == QEvent::Gesture)
             return true;
-        if (isTouch(event->type()))
+        if (OneFinger::isTouch(event))
             return handleTouch(watched, static_cast<QTouchEvent*>(event));
     }
     return QScrollArea::eventFilter(watched, event);

@@ -142,11 +142,6 @@ void CustomComboBoxView::showLastRowWhole()
 bool CustomComboBoxView::viewportEvent(QEvent* event)
 {
     switch (event->type()) {
-    case QEvent::TouchBegin:
-    case QEvent::TouchUpdate:
-    case QEvent::TouchEnd:
-    case QEvent::TouchCancel:
-        return onTouchEvent(static_cast<QTouchEvent*>(event));
     case QEvent::MouseButtonPress:
     case QEvent::MouseButtonDblClick:
     case QEvent::MouseMove:
@@ -159,7 +154,8 @@ bool CustomComboBoxView::viewportEvent(QEvent* event)
         stopFlick();
         return QListView::viewportEvent(event);
     default:
-        return QListView::viewportEvent(event);
+        return OneFinger::isTouch(event) ? onTouchEvent(static_cast<QTouchEvent*>(event))
+                                         : QListView::viewportEvent(event);
     }
 }
 

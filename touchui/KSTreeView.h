@@ -1,15 +1,16 @@
 #pragma once
 
+#include "touchui/ElidedTextTip.h"
 #include "touchui/Flicker.h"
 #include "touchui/KSVIEW.h"
 #include "touchui/KSViewStyle.h"
 #include "touchui/OneFinger.h"
+#include "touchui/TreeLoadingMarks.h"
 
 #include <QEvent>
 #include <QMap>
 #include <QPersistentModelIndex>
 #include <QStringList>
-#include <QTimer>
 #include <QTreeView>
 #include <memory>
 
@@ -70,7 +71,7 @@ public:
     // Toggles a checkable and enabled cell, with all below and above it.
     virtual void changeCheckState(const QModelIndex& index);
     virtual void changeParentsCheckState(const QModelIndex& index);
-    // Sets a row's state by how many of its children are on or partial: none, all and each of them on, else.
+    // See TreeCheckStates.
     virtual void changeCheckStateByNumber(const QModelIndex& index, int number);
     virtual void changeChildrenCheckState(const QModelIndex& index, Qt::CheckState state);
     // Moves the current row right behind a row of the same parent; false when that cannot be.
@@ -178,7 +179,6 @@ private:
     QRect firstCellRect(const QModelIndex& index) const;
     bool isUsable(const QModelIndex& index) const;
     void showElidedText(const QModelIndex& index);
-    void hideElidedText();
 
     std::unique_ptr<KSViewStyle> m_viewStyle;
     CustomTreeDelegete* m_delegate;
@@ -197,9 +197,8 @@ private:
     QPersistentModelIndex m_pressedIndicator;
     QPersistentModelIndex m_renameIndex;
     bool m_checkBoxVisible = true;
-    bool m_elidedTextShown = false;
 
     int m_holdInterval = HOLD_INTERVAL;
-    QTimer m_singleShotTimer; // takes the balloon of a shortened name away
-    QTimer m_loadingTimer;
+    ElidedTextTip m_elidedText;
+    TreeLoadingMarks m_loadingMarks;
 };
