@@ -31,6 +31,7 @@
 #include "touchui/KSPushbutton.h"
 #include "touchui/KSScrollViewerWidget.h"
 #include "touchui/KSToolTip.h"
+#include "touchui/TightLayout.h"
 #include "touchui/WindowPlaceKeeper.h"
 
 #include <QAction>
@@ -72,15 +73,6 @@ const char MOVE_BUTTON_IMAGES[] =
     "Button-38B_Pressed_Left:Button-38B_Pressed_Center:Button-38B_Pressed_Right::::"
     "Button-38selected_Rest_Left:Button-38selected_Rest_Center:Button-38selected_Rest_Right:"
     "Button-38selected_Pressed_Left:Button-38selected_Pressed_Center:Button-38selected_Pressed_Right:::";
-
-template <typename Layout>
-Layout* newLayout()
-{
-    auto* layout = new Layout;
-    layout->setContentsMargins(0, 0, 0, 0);
-    layout->setSpacing(0);
-    return layout;
-}
 
 } // namespace
 

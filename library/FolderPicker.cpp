@@ -50,14 +50,6 @@ constexpr QRect MASK_AREA(7, 9, 1088 - 14, 742 - 18);
 constexpr QColor FRAME_COLOR(17, 17, 17);
 constexpr QColor FRAME_LINE_COLOR(85, 85, 85);
 
-const char BUTTON_IMAGES[] =
-    "TextToolPanel_Buttons:Button_48_Rest_Left:Button_48_Rest_Center:Button_48_Rest_Right:"
-    "Button_48_Pressed_Left:Button_48_Pressed_Center:Button_48_Pressed_Right:"
-    "Button_48_Disabled_Left:Button_48_Disabled_Center:Button_48_Disabled_Right:"
-    "Button_48selected_Rest_Left:Button_48selected_Rest_Center:Button_48selected_Rest_Right:"
-    "Button_48selected_Pressed_Left:Button_48selected_Pressed_Center:Button_48selected_Pressed_Right:"
-    "Button_48selected_Disabled_Left:Button_48selected_Disabled_Center:Button_48selected_Disabled_Right";
-
 } // namespace
 
 FolderPicker::FolderPicker(QWidget* parent)
@@ -147,7 +139,7 @@ void FolderPicker::createButtons()
     const int top = STARTPOINT_OF_BOTTOM_HSEPARATOR.y() + SEPARATOR_HEIGHT;
     const int y = top + (FOLDER_PICKER_SIZE.height() - FRAME_MARGIN - top - BUTTON_SIZE.height()) / 2;
     for (int id = 0; id < ButtonCount; ++id) {
-        auto* button = new KSPushbutton(QString::fromLatin1(BUTTON_IMAGES), this);
+        auto* button = new KSPushbutton(QString::fromLatin1(KSPushbutton::STANDARD_IMAGES), this);
         button->setObjectName(QLatin1String(names[id]));
         button->setStyleSheet(QStringLiteral("font-size:24px; color:rgb(220, 220, 220);"));
         button->setGeometry(QRect(QPoint(places[id], y), BUTTON_SIZE));

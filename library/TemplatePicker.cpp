@@ -44,14 +44,6 @@ const int PANE_TOP = TemplatePicker::TABS_HIGHT + TemplatePicker::PAINS_SPACE;
 const int PANE_WIDTH = TemplatePicker::SCROLL_AREA_WIDTH + 2 * TemplatePicker::PAIN_LINE;
 const int PROPERTY_LEFT = PANE_LEFT + PANE_WIDTH + TemplatePicker::PAINS_SPACE;
 
-const char BUTTON_IMAGES[] =
-    "TextToolPanel_Buttons:Button_48_Rest_Left:Button_48_Rest_Center:Button_48_Rest_Right:"
-    "Button_48_Pressed_Left:Button_48_Pressed_Center:Button_48_Pressed_Right:"
-    "Button_48_Disabled_Left:Button_48_Disabled_Center:Button_48_Disabled_Right:"
-    "Button_48selected_Rest_Left:Button_48selected_Rest_Center:Button_48selected_Rest_Right:"
-    "Button_48selected_Pressed_Left:Button_48selected_Pressed_Center:Button_48selected_Pressed_Right:"
-    "Button_48selected_Disabled_Left:Button_48selected_Disabled_Center:Button_48selected_Disabled_Right";
-
 } // namespace
 
 TemplatePicker::TemplatePicker(QWidget* parent)
@@ -139,7 +131,7 @@ void TemplatePicker::createButtons()
 
 KSPushbutton* TemplatePicker::createButton(QWidget* parent, const QPoint& position, const char* name)
 {
-    auto* button = new KSPushbutton(QString::fromLatin1(BUTTON_IMAGES), parent);
+    auto* button = new KSPushbutton(QString::fromLatin1(KSPushbutton::STANDARD_IMAGES), parent);
     button->setObjectName(QLatin1String(name));
     button->setStyleSheet(QStringLiteral("color:rgb(220, 220, 220);"));
     button->setGeometry(QRect(position, TOOLBARBTN_SIZE));

@@ -3,6 +3,7 @@
 #include "canvas/TextObjectConstants.h"
 #include "touchui/KSPushbutton.h"
 #include "touchui/KSRadiobutton.h"
+#include "touchui/TightLayout.h"
 
 #include <QEvent>
 #include <QFontMetrics>
@@ -35,15 +36,6 @@ constexpr int LABEL_SPACING = 8;
 constexpr int RANGE_WIDTH = 110;
 constexpr int RANGE_LABEL_WIDTH = 62;
 constexpr int SLACK = 2; // widths are rounded
-
-template <typename Layout>
-Layout* newLayout()
-{
-    auto* layout = new Layout;
-    layout->setContentsMargins(0, 0, 0, 0);
-    layout->setSpacing(0);
-    return layout;
-}
 
 } // namespace
 

@@ -12,6 +12,7 @@
 #include "panel/ShadowToolBox.h"
 #include "panel/SizeToolBox.h"
 #include "panel/TextColorToolBox.h"
+#include "touchui/TightLayout.h"
 
 #include <QHBoxLayout>
 #include <QVBoxLayout>
@@ -49,18 +50,9 @@ QString familyOf(SystemSetupDef::emInformationModel model, SystemSetupDef::emInp
     }
 }
 
-template <typename Layout>
-Layout* newLayout()
-{
-    auto* layout = new Layout;
-    layout->setContentsMargins(0, 0, 0, 0);
-    layout->setSpacing(TextToolsPanel::TEXTTOOL_LAYOUT_SPACING);
-    return layout;
-}
-
 QHBoxLayout* newRow(const QList<QWidget*>& widgets)
 {
-    auto* row = newLayout<QHBoxLayout>();
+    auto* row = newLayout<QHBoxLayout>(TextToolsPanel::TEXTTOOL_LAYOUT_SPACING);
     for (QWidget* widget : widgets)
         row->addWidget(widget);
     row->addStretch();
@@ -103,7 +95,7 @@ QList<ToolBox*> TextToolsPanel::boxes() const
 
 void TextToolsPanel::createLayout()
 {
-    auto* row = newLayout<QHBoxLayout>();
+    auto* row = newLayout<QHBoxLayout>(TEXTTOOL_LAYOUT_SPACING);
     row->addSpacing(LEFT_MARGIN);
     row->addLayout(createLeftBlock());
     row->addSpacing(BLOCK_SPACING);
@@ -116,7 +108,7 @@ void TextToolsPanel::createLayout()
 
 QLayout* TextToolsPanel::createLeftBlock()
 {
-    auto* block = newLayout<QVBoxLayout>();
+    auto* block = newLayout<QVBoxLayout>(TEXTTOOL_LAYOUT_SPACING);
     block->addLayout(newRow({m_family, m_textColor}));
     block->addSpacing(ROW_SPACING);
     block->addLayout(newRow({m_size}));
@@ -128,7 +120,7 @@ QLayout* TextToolsPanel::createLeftBlock()
 
 QLayout* TextToolsPanel::createMiddleBlock()
 {
-    auto* block = newLayout<QVBoxLayout>();
+    auto* block = newLayout<QVBoxLayout>(TEXTTOOL_LAYOUT_SPACING);
     block->addLayout(newRow({m_edge}));
     block->addSpacing(ROW_SPACING);
     block->addLayout(newRow({m_shadow}));
