@@ -8,7 +8,6 @@
 #include <QLineEdit>
 #include <QPixmap>
 
-
 class FolderEditor : public QLineEdit
 {
     Q_OBJECT

@@ -8,7 +8,6 @@
 
 #include <array>
 
-
 // A radio button for one finger, painted from the pictures under ":/KSRadioButton" or another folder:
 // Radiobutton_On_Rest, Radiobutton_On_Pressed, Radiobutton_On_Disabled and the same with Off.
 class KSRadiobutton : public QRadioButton
