@@ -24,6 +24,7 @@
 #include "document/PngWriter.h"
 #include "document/TText.h"
 #include "support/LogManager.h"
+#include "touchui/FieldName.h"
 
 #include <QAction>
 #include <QCoreApplication>
@@ -653,7 +654,7 @@ void CanvasScene::customEvent(QEvent* event)
 
 QString CanvasScene::getDataInfo(const SubCommonDefine::tagSoftKeyBoardInitData& data) const
 {
-    return SoftKeyboardField::getDataInfo(data);
+    return FieldName::write(data);
 }
 
 QString CanvasScene::getNewTextDataInfo(const QString& text) const

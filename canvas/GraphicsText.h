@@ -5,6 +5,7 @@
 #include "canvas/TextObjectConstants.h"
 #include "canvas/TextPlacement.h"
 #include "messaging/services/SystemSetupDef.h"
+#include "touchui/CanvasTextField.h"
 
 #include <QGraphicsTextItem>
 #include <QPointF>
@@ -36,7 +37,7 @@ class GraphicsText : public QGraphicsTextItem, private ITextSurface, private ITe
 {
     Q_OBJECT
 public:
-    enum { Type = UserType + 10 };
+    enum { Type = CanvasTextField::ITEM_TYPE };
 
     // A child that shows a copy of the record (null: a default record without characters). An id that is not
     // 0 becomes the id of the copy.

@@ -2,8 +2,8 @@
 
 #include "canvas/GraphicsText.h"
 #include "canvas/TextObjectConstants.h"
+#include "touchui/FieldName.h"
 
-#include <QStringList>
 #include <QTextCursor>
 
 using namespace TextObjectConstants;
@@ -34,26 +34,14 @@ SubCommonDefine::tagSoftKeyBoardInitData fieldData(const QString& title, const Q
 
 } // namespace
 
-QString SoftKeyboardField::getDataInfo(const SubCommonDefine::tagSoftKeyBoardInitData& data)
-{
-    const QStringList fields{
-        QString::number(data.fieldKind),      QString::fromStdWString(data.title),
-        QString::number(data.keyboardType),   QString::number(data.maxLength),
-        QString::fromStdWString(data.text),   QString::number(data.textLength),
-        QString::number(data.selectionStart), QString::number(data.selectionEnd),
-        QString::number(data.selectionMode),  QString::fromStdWString(data.limitCondition),
-        QString::number(data.lastValue)};
-    return fields.join(QLatin1Char('#'));
-}
-
 QString SoftKeyboardField::newText(const QString& title, const QString& text)
 {
-    return getDataInfo(fieldData(title, text, NewTextKeyboard));
+    return FieldName::write(fieldData(title, text, NewTextKeyboard));
 }
 
 QString SoftKeyboardField::doubleClick(const QString& title, const QString& text)
 {
-    return getDataInfo(fieldData(title, text, EditKeyboard));
+    return FieldName::write(fieldData(title, text, EditKeyboard));
 }
 
 QString SoftKeyboardField::commonState(const QString& title, const QString& text, const GraphicsText& item)
@@ -63,7 +51,7 @@ QString SoftKeyboardField::commonState(const QString& title, const QString& text
     data.selectionStart = getCursorSelectionStartPosition(item);
     data.selectionEnd = item.textCursor().position();
     data.selectionMode = item.isHandleCaret() ? 1 : 0;
-    return getDataInfo(data);
+    return FieldName::write(data);
 }
 
 int SoftKeyboardField::getCursorSelectionStartPosition(const GraphicsText& item)

@@ -1,18 +1,13 @@
 #pragma once
 
-#include "messaging/services/SubCommonDefine.h"
-
 #include <QString>
 
 class GraphicsText;
 
-// How a text object describes itself to the soft keyboard: eleven fields separated by "#", in the order of
-// tagSoftKeyBoardInitData.
+// How a text object describes itself to the soft keyboard: the name that it bears as a field.
 class SoftKeyboardField
 {
 public:
-    static QString getDataInfo(const SubCommonDefine::tagSoftKeyBoardInitData& data);
-
     // A new object: the keyboard starts afresh.
     static QString newText(const QString& title, const QString& text);
     // A double tap has selected the whole text.

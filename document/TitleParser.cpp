@@ -2,6 +2,8 @@
 
 #include "document/Archive.h"
 #include "document/DocumentConstants.h"
+#include "document/FolderOrder.h"
+#include "document/FolderTitles.h"
 #include "document/TText.h"
 #include "document/TitleParserUtility.h"
 #include "support/AtomicFile.h"
@@ -11,8 +13,10 @@
 #include <algorithm>
 #include <array>
 #include <memory>
+#include <stdexcept>
 #include <string_view>
 #include <tinyxml.h>
+#include <utility>
 
 namespace
 {
@@ -450,4 +454,40 @@ int TitleParser::modifyGain(std::string path, std::string value)
 int TitleParser::modifyDensity(std::string path, std::string value)
 {
     return modifyAttributeValue(path, META_DENSITY, value);
+}
+
+std::vector<ArchiveOrder*> TitleParser::readFileOrderInFolder(std::string folder)
+{
+    std::vector<ArchiveOrder> rows;
+    FolderOrder::read(folder, rows);
+    std::vector<ArchiveOrder*> result;
+    result.reserve(rows.size());
+    for (ArchiveOrder& row : rows)
+        result.push_back(new ArchiveOrder(std::move(row)));
+    return result;
+}
+
+int TitleParser::writeFileOrderInFolder(std::string folder, std::vector<ArchiveOrder> rows)
+{
+    return FolderOrder::write(folder, rows) ? 1 : -1;
+}
+
+std::vector<Archive*> TitleParser::getFilsByOrderInFolder(std::string folder)
+{
+    const FolderTitles titles(std::move(folder));
+    for (std::size_t row = 0; row < titles.count(); ++row) {
+        if (!titles.canBeTitle(row))
+            throw std::out_of_range("a row too short for the name of a title file");
+    }
+    std::vector<Archive*> result;
+    for (std::unique_ptr<Archive>& title : titles.read(0, titles.count())) {
+        if (title)
+            result.push_back(title.release());
+    }
+    return result;
+}
+
+std::vector<Archive*> TitleParser::getFilesByOrderInFolderWithoutCheck(std::string folder)
+{
+    return getFilsByOrderInFolder(std::move(folder));
 }

@@ -17,11 +17,6 @@ namespace
 
 const QSize PAGE(960, 640);
 
-const QString BUTTON_IMAGES =
-    QStringLiteral("TextToolPanel_Buttons:Button_48_Rest_Left:Button_48_Rest_Center:Button_48_Rest_Right:"
-                   "Button_48_Pressed_Left:Button_48_Pressed_Center:Button_48_Pressed_Right:"
-                   "Button_48_Disabled_Left:Button_48_Disabled_Center:Button_48_Disabled_Right");
-
 KSCombobox* comboBox(const GalleryPage& page, const QRect& place, const QStringList& rows)
 {
     auto* box = new KSCombobox(page.window.get());
@@ -42,7 +37,8 @@ QStringList numbered(const QString& text, int count)
 // A button that opens a menu like that of the title list.
 KSMenu* menuAt(const GalleryPage& page, const QPoint& place, const QString& text, int alignment)
 {
-    auto* button = new KSPushbutton(BUTTON_IMAGES, text, page.window.get());
+    auto* button =
+        new KSPushbutton(QString::fromLatin1(KSPushbutton::STANDARD_IMAGES), text, page.window.get());
     button->setGeometry(QRect(place, QSize(140, 48)));
     auto* menu = new KSMenu(page.window.get());
     for (const char* name : {"Create New", "Copy", "Paste", "Delete"}) {
@@ -122,7 +118,8 @@ GalleryPage GalleryPages::balloons()
 {
     GalleryPage page(QStringLiteral("balloons"), PAGE);
     const auto anchor = [&page](const QRect& place, const QString& text) {
-        auto* button = new KSPushbutton(BUTTON_IMAGES, text, page.window.get());
+        auto* button =
+            new KSPushbutton(QString::fromLatin1(KSPushbutton::STANDARD_IMAGES), text, page.window.get());
         button->setGeometry(place);
         return button;
     };

@@ -8,7 +8,6 @@
 #include <QKeyEvent>
 #include <QMouseEvent>
 #include <QPainter>
-#include <QTouchEvent>
 
 const QString FolderEditor::FOLDER_PICKER_REGEXP = FolderNameRules::PATTERN;
 const QString FolderEditor::LEFT_IMAGE = QStringLiteral(":/TextToolPanel_TextBox/TextBox_Edittable_Left");
@@ -40,6 +39,8 @@ FolderEditor::FolderEditor(QWidget* parent)
     const QRect text = getTextRect();
     setTextMargins(text.left(), 0, width() - text.right() - 1, 0);
 
+    connect(&mFinger, &OneFinger::acted, this,
+            [this](QEvent::Type type) { sendMouse(type, mFinger.position()); });
     // Outside: the field is let go of, but not clicked.
     connect(&mFinger, &OneFinger::cancelled, this,
             [this] { sendMouse(QEvent::MouseButtonRelease, mapToGlobal(QPointF(-1, -1))); });
@@ -58,48 +59,19 @@ QRect FolderEditor::getTextRect() const
 
 bool FolderEditor::event(QEvent* event)
 {
-    switch (static_cast<int>(event->type())) {
-    case QEvent::TouchBegin:
-    case QEvent::TouchUpdate:
-    case QEvent::TouchEnd:
-    case QEvent::TouchCancel:
-        return handleTouch(static_cast<QTouchEvent*>(event));
-    case KSInputContext::SoftKeyBoardCloseType:
+    if (event->type() == QEvent::Type(KSInputContext::SoftKeyBoardCloseType)) {
         Q_EMIT signalPressedClose();
         return true;
-    default:
-        return QLineEdit::event(event);
     }
-}
-
-bool FolderEditor::handleTouch(QTouchEvent* event)
-{
-    event->accept();
-    switch (mFinger.follow(event)) {
-    case OneFinger::Step::Begin:
-        sendMouse(QEvent::MouseButtonPress, mFinger.position());
-        break;
-    case OneFinger::Step::Move:
-        sendMouse(QEvent::MouseMove, mFinger.position());
-        break;
-    case OneFinger::Step::End:
-        sendMouse(QEvent::MouseButtonRelease, mFinger.position());
-        break;
-    case OneFinger::Step::None:
-        break;
-    }
-    return true;
+    return mFinger.takes(event) || QLineEdit::event(event);
 }
 
 void FolderEditor::sendMouse(QEvent::Type type, const QPointF& globalPosition)
 {
-    const bool release = type == QEvent::MouseButtonRelease;
-    QMouseEvent mouse(type, mapFromGlobal(globalPosition), globalPosition,
-                      type == QEvent::MouseMove ? Qt::NoButton : Qt::LeftButton,
-                      release ? Qt::NoButton : Qt::LeftButton, Qt::NoModifier);
+    QMouseEvent mouse = OneFinger::mouseEvent(type, mapFromGlobal(globalPosition), globalPosition);
     if (type == QEvent::MouseButtonPress)
         mousePressEvent(&mouse);
-    else if (release)
+    else if (type == QEvent::MouseButtonRelease)
         mouseReleaseEvent(&mouse);
     else
         mouseMoveEvent(&mouse);

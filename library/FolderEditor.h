@@ -8,8 +8,6 @@
 #include <QLineEdit>
 #include <QPixmap>
 
-class QTouchEvent;
-
 class FolderEditor : public QLineEdit
 {
     Q_OBJECT
@@ -44,7 +42,6 @@ private:
     // The text, its selection and its caret are QLineEdit's, inside this rectangle.
     QRect getTextRect() const;
     void drawFrame(QPainter& painter) const;
-    bool handleTouch(QTouchEvent* event);
     void sendMouse(QEvent::Type type, const QPointF& globalPosition);
 
     QPixmap mLeft;

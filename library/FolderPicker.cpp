@@ -1,7 +1,6 @@
 #include "library/FolderPicker.h"
 
 #include "canvas/MessageBoxController.h"
-#include "library/DialogButtonImages.h"
 #include "library/FolderEditor.h"
 #include "library/FolderNameRules.h"
 #include "library/FolderPickerFactory.h"
@@ -167,7 +166,7 @@ void FolderPicker::createButtons()
     const int top = STARTPOINT_OF_BOTTOM_HSEPARATOR.y() + SEPARATOR_HEIGHT;
     const int y = top + (FOLDER_PICKER_SIZE.height() - FRAME_MARGIN - top - BUTTON_SIZE.height()) / 2;
     for (int id = 0; id < ButtonCount; ++id) {
-        auto* button = new KSPushbutton(QString::fromLatin1(DIALOG_BUTTON_IMAGES), this);
+        auto* button = new KSPushbutton(QString::fromLatin1(KSPushbutton::STANDARD_IMAGES), this);
         button->setObjectName(QLatin1String(names[id]));
         button->setStyleSheet(QStringLiteral("font-size:24px; color:rgb(220, 220, 220);"));
         button->setGeometry(QRect(QPoint(places[id], y), BUTTON_SIZE));

@@ -3,7 +3,6 @@
 #include "canvas/DrawBoundingRectangle.h"
 #include "canvas/MessageBoxController.h"
 #include "library/ArchiveItem.h"
-#include "library/DialogButtonImages.h"
 #include "library/ListMessages.h"
 #include "library/TemplateItem.h"
 #include "library/TemplateScrollArea.h"
@@ -171,7 +170,7 @@ void TemplatePicker::createButtons()
 
 KSPushbutton* TemplatePicker::createButton(QWidget* parent, const QPoint& position, const char* name)
 {
-    auto* button = new KSPushbutton(QString::fromLatin1(DIALOG_BUTTON_IMAGES), parent);
+    auto* button = new KSPushbutton(QString::fromLatin1(KSPushbutton::STANDARD_IMAGES), parent);
     button->setObjectName(QLatin1String(name));
     button->setStyleSheet(QStringLiteral("color:rgb(220, 220, 220);"));
     button->setGeometry(QRect(position, TOOLBARBTN_SIZE));

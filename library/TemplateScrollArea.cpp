@@ -1,15 +1,12 @@
 #include "library/TemplateScrollArea.h"
 
-#include "touchui/FlickMotion.h"
 #include "touchui/KSScrollBar.h"
-#include "touchui/TouchClock.h"
 #include "touchui/TouchEventButton.h"
 
 #include <QApplication>
 #include <QMouseEvent>
 #include <QPushButton>
 #include <QScrollBar>
-#include <QTimerEvent>
 #include <QTouchEvent>
 #include <QWheelEvent>
 
@@ -18,20 +15,12 @@ const QSize TemplateScrollArea::TOUCH_RECT_SIZE(50, 50);
 namespace
 {
 
-constexpr FlickMotion::Rules RULES = FlickMotion::templateGrid();
-
 // Narrower than in other lists: four columns and the bar fill the area.
 const char SCROLL_BAR_STYLE[] =
     "QScrollBar:vertical { margin: 0px; border: 0px; width: 27px; background-color: rgb(51, 51, 51) }"
     "QScrollBar::up-arrow:vertical { height: 0px } QScrollBar::down-arrow:vertical { height: 0px }"
     "QScrollBar::add-line:vertical { height: 0px } QScrollBar::sub-line:vertical { height: 0px }"
     "QScrollBar::handle:vertical { min-height: 42px }";
-
-bool isTouch(QEvent::Type type)
-{
-    return type == QEvent::TouchBegin || type == QEvent::TouchUpdate || type == QEvent::TouchEnd ||
-           type == QEvent::TouchCancel;
-}
 
 } // namespace
 
@@ -43,6 +32,7 @@ TemplateScrollArea::TemplateScrollArea(QWidget* parent) : QScrollArea(parent)
     setHorizontalScrollBarPolicy(Qt::ScrollBarAlwaysOff);
     setFocusPolicy(Qt::NoFocus);
     connect(&mFinger, &OneFinger::cancelled, this, &TemplateScrollArea::rest);
+    connect(&mFlicker, &Flicker::ticked, this, &TemplateScrollArea::getDistance);
 }
 
 void TemplateScrollArea::initTouch()
@@ -53,23 +43,10 @@ void TemplateScrollArea::initTouch()
     verticalScrollBar()->installEventFilter(this);
 }
 
-bool TemplateScrollArea::isFlickEnd() const
-{
-    return FlickMotion::isFlickEnd(RULES, mStartPoint, mEndPoint);
-}
-
-void TemplateScrollArea::stopFlick()
-{
-    if (mTimerId != 0)
-        TouchClock::instance().stop(this, mTimerId);
-    mTimerId = 0;
-    mFlick = false;
-}
-
 // Nothing was tapped, and nothing goes on moving.
 void TemplateScrollArea::rest()
 {
-    stopFlick();
+    mFlicker.cancel();
     mPressedButton.clear();
 }
 
@@ -83,7 +60,7 @@ bool TemplateScrollArea::event(QEvent* event)
 {
     if (event->type() == QEvent::Gesture)
         return true;
-    if (isTouch(event->type()))
+    if (OneFinger::isTouch(event))
         return handleTouch(this, static_cast<QTouchEvent*>(event));
     return QScrollArea::event(event);
 }
@@ -99,7 +76,7 @@ bool TemplateScrollArea::eventFilter(QObject* watched, QEvent* event)
     if (watched == viewport() || qobject_cast<QPushButton*>(watched)) {
         if (event->type() == QEvent::Gesture)
             return true;
-        if (isTouch(event->type()))
+        if (OneFinger::isTouch(event))
             return handleTouch(watched, static_cast<QTouchEvent*>(event));
     }
     return QScrollArea::eventFilter(watched, event);
@@ -107,7 +84,7 @@ bool TemplateScrollArea::eventFilter(QObject* watched, QEvent* event)
 
 bool TemplateScrollArea::handleTouch(QObject* watched, QTouchEvent* event)
 {
-    const bool wasFlicking = mFlick;
+    const bool wasFlicking = mFlicker.isGliding();
     if (mFinger.follow(event, watched) == OneFinger::Step::None)
         return true;
     onTouchEvent();
@@ -122,34 +99,15 @@ void TemplateScrollArea::onTouchEvent()
 {
     const QPoint position = mFinger.positionIn(this).toPoint();
     if (mFinger.step() == OneFinger::Step::Begin) {
-        stopFlick();
+        mFlicker.begin(position);
         mPressedButton.clear();
-        mStartPoint = mEndPoint = position;
-        mFirstMove = true;
     } else if (!rect().contains(position)) {
         return;
     } else if (mFinger.step() == OneFinger::Step::Move) {
-        moveTo(position);
+        mFlicker.follow(position);
     } else {
-        liftAt(position);
+        mFlicker.lift(position);
     }
-}
-
-void TemplateScrollArea::moveTo(const QPoint& position)
-{
-    if (mFirstMove)
-        mStartPoint = position;
-    mFirstMove = false;
-    setEndPoint(position);
-}
-
-void TemplateScrollArea::liftAt(const QPoint& position)
-{
-    setEndPoint(position);
-    if (isFlickEnd())
-        stopFlick();
-    else
-        mFlick = true;
 }
 
 void TemplateScrollArea::onTranslateTouchEventToMouse(QObject* watched)
@@ -158,7 +116,6 @@ void TemplateScrollArea::onTranslateTouchEventToMouse(QObject* watched)
         mPressPoint = mFinger.position().toPoint();
         mMoved = false;
         mPressedButton = qobject_cast<QPushButton*>(watched);
-        mValueAtStart = verticalScrollBar()->value();
         sendPressToViewport(mPressPoint);
         return;
     }
@@ -178,37 +135,10 @@ void TemplateScrollArea::sendPressToViewport(const QPoint& global)
     QCoreApplication::sendEvent(viewport(), &press);
 }
 
-void TemplateScrollArea::setEndPoint(const QPoint& point)
-{
-    mEndPoint = point;
-    if (!isFlickEnd() && mTimerId == 0) {
-        mValueAtStart = verticalScrollBar()->value();
-        mTimerId = TouchClock::instance().start(this, TOUCH_TIMER_TIME);
-    }
-}
-
-void TemplateScrollArea::timerEvent(QTimerEvent* event)
-{
-    if (event->timerId() != mTimerId) {
-        QScrollArea::timerEvent(event);
-        return;
-    }
-    if (isFlickEnd())
-        stopFlick();
-    else
-        getDistance();
-    const QScrollBar* bar = verticalScrollBar();
-    if (FlickMotion::isAtLimit(bar->value(), bar->minimum(), bar->maximum()))
-        stopFlick();
-}
-
-// One step of the start point towards the end point, and of the content by half of what lay between.
+// One step of the content, by half of the way that is left.
 void TemplateScrollArea::getDistance()
 {
-    const FlickMotion::Step step = mFlick ? FlickMotion::flickStep(RULES, mStartPoint, mEndPoint)
-                                          : FlickMotion::dragStep(RULES, mStartPoint, mEndPoint);
-    mStartPoint = step.start.toPoint();
-    changeScrollBarValue(step.scroll);
+    changeScrollBarValue(FlickMotion::pixels(mFlicker.advance()).y());
 }
 
 void TemplateScrollArea::changeScrollBarValue(int distance)

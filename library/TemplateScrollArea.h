@@ -5,6 +5,7 @@
 // event filter. GUI thread.
 #pragma once
 
+#include "touchui/Flicker.h"
 #include "touchui/OneFinger.h"
 
 #include <QPoint>
@@ -20,17 +21,17 @@ class TemplateScrollArea : public QScrollArea
     Q_OBJECT
 
 public:
-    static const int TOUCH_TIMER_TIME = 33;   // ms
-    static const int DOUBLE_TOUCH_TIME = 500; // ms
+    static const int TOUCH_TIMER_TIME = FlickMotion::templateGrid().interval; // ms
+    static const int DOUBLE_TOUCH_TIME = 500;                                 // ms
     static const QSize TOUCH_RECT_SIZE;
 
     explicit TemplateScrollArea(QWidget* parent = nullptr);
 
     // Lets touches in. Called once the area has its viewport and scroll bar.
     void initTouch();
-    void stopFlick();
+    void stopFlick() { mFlicker.stop(); }
     // Whether the finger and the point that follows it are as near as they get.
-    bool isFlickEnd() const;
+    bool isFlickEnd() const { return mFlicker.isEnd(); }
     // For a button that is taken out of the grid: a finger on it gets no further.
     void letGoOf(TouchEventButton* button);
 
@@ -41,7 +42,6 @@ Q_SIGNALS:
 protected:
     bool eventFilter(QObject* watched, QEvent* event) override;
     bool event(QEvent* event) override;
-    void timerEvent(QTimerEvent* event) override;
     void wheelEvent(QWheelEvent* event) override;
     void hideEvent(QHideEvent* event) override;
 
@@ -49,22 +49,14 @@ private:
     bool handleTouch(QObject* watched, QTouchEvent* event);
     void onTouchEvent();
     void onTranslateTouchEventToMouse(QObject* watched);
-    void moveTo(const QPoint& position);
-    void liftAt(const QPoint& position);
-    void setEndPoint(const QPoint& point);
     void getDistance();
     void changeScrollBarValue(int distance);
     void rest();
     void sendPressToViewport(const QPoint& global);
 
-    QPoint mStartPoint; // in this widget, like the end point
-    QPoint mEndPoint;
     OneFinger mFinger{this};
-    int mTimerId = 0;
-    bool mFlick = false;
-    bool mFirstMove = false;
-    int mValueAtStart = 0;
-    QPoint mPressPoint; // global
+    Flicker mFlicker{this, FlickMotion::templateGrid()}; // in coordinates of this widget
+    QPoint mPressPoint;                                  // global
     bool mMoved = false;
     QPointer<QPushButton> mPressedButton;
 };

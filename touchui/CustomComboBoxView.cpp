@@ -1,20 +1,16 @@
 #include "touchui/CustomComboBoxView.h"
 
-#include "touchui/FlickMotion.h"
 #include "touchui/KSScrollBar.h"
-#include "touchui/TouchClock.h"
 
 #include <QKeyEvent>
 #include <QMouseEvent>
 #include <QPainter>
 #include <QScrollBar>
-#include <QTimerEvent>
 #include <QTouchEvent>
 
 namespace
 {
 
-constexpr FlickMotion::Rules RULES = FlickMotion::treeView();
 // Without arrows: the bar is all track and handle.
 const char LIST_STYLE[] = "QListView { background: transparent; border: 0px; }"
                           "QScrollBar { margin: 0px; border: 0px; background-color: rgb(51, 51, 51) }"
@@ -38,11 +34,8 @@ CustomComboBoxView::CustomComboBoxView(QWidget* parent)
     setUniformItemSizes(true);
     setStyleSheet(QString::fromLatin1(LIST_STYLE));
     connect(&m_finger, &OneFinger::cancelled, this, &CustomComboBoxView::rest);
-}
-
-CustomComboBoxView::~CustomComboBoxView()
-{
-    CustomComboBoxView::stopFlick();
+    connect(&m_flicker, &Flicker::ticked, this, [this] { changeScrollBarValue(getDistance().y()); });
+    connect(&m_flicker, &Flicker::ended, this, &CustomComboBoxView::showLastRowWhole);
 }
 
 bool CustomComboBoxView::onTouchEvent(QTouchEvent* event)
@@ -85,41 +78,32 @@ QPoint CustomComboBoxView::fingerPosition() const
 
 void CustomComboBoxView::pressAt(const QPoint& position)
 {
-    m_brake = m_autoFlick;
-    stopFlick();
-    m_down = true;
+    const bool brake = isAutoFilck();
     m_pressPoint = position;
-    setStartPoint(position);
-    setEndPoint(position);
-    setPressedIndex(m_brake ? QModelIndex() : indexAt(position));
+    m_flicker.begin(position);
+    setPressedIndex(brake ? QModelIndex() : indexAt(position));
 }
 
 void CustomComboBoxView::moveTo(const QPoint& position)
 {
-    if (!m_down) {
+    if (!m_flicker.isFollowing()) {
         return;
     }
-    setEndPoint(position);
-    if (m_hasFlicked || FlickMotion::isBeyondSlop(m_pressPoint, position, FlickMotion::TOUCH_SLOP)) {
+    m_flicker.follow(position);
+    if (hasFlicked() || FlickMotion::isBeyondSlop(m_pressPoint, position, FlickMotion::TOUCH_SLOP)) {
         setPressedIndex(QModelIndex());
     }
 }
 
 void CustomComboBoxView::releaseAt(const QPoint& position)
 {
-    if (!m_down) {
+    if (!m_flicker.isFollowing()) {
         return;
     }
-    m_down = false;
-    setEndPoint(position);
+    m_flicker.lift(position);
     const QModelIndex tapped = m_pressedIndex;
     setPressedIndex(QModelIndex());
-    if (!isFlickEnd()) {
-        setAutoFlick(true);
-        return;
-    }
-    stopFlick();
-    if (!m_hasFlicked && tapped.isValid() && indexAt(position) == tapped &&
+    if (!isAutoFilck() && !hasFlicked() && tapped.isValid() && indexAt(position) == tapped &&
         (tapped.flags() & Qt::ItemIsEnabled)) {
         Q_EMIT signalTapped(tapped);
     }
@@ -133,103 +117,31 @@ void CustomComboBoxView::cancelTouch()
 
 void CustomComboBoxView::rest()
 {
-    m_down = false;
+    m_flicker.cancel();
     setPressedIndex(QModelIndex());
-    stopFlick();
-}
-
-void CustomComboBoxView::setAutoFlick(bool on)
-{
-    m_autoFlick = on;
-}
-
-void CustomComboBoxView::setStartPoint(const QPoint& point)
-{
-    m_startPoint = point;
-    m_hasFlicked = false;
-}
-
-void CustomComboBoxView::setEndPoint(const QPoint& point)
-{
-    m_endPoint = point;
-    if (!isFlickEnd() && m_flickTimerId == 0) {
-        m_scrollValue = verticalScrollBar()->value();
-        m_flickTimerId = TouchClock::instance().start(this, RULES.interval);
-        m_hasFlicked = true;
-    }
-}
-
-bool CustomComboBoxView::isFlickEnd() const
-{
-    return FlickMotion::isFlickEnd(RULES, m_startPoint, m_endPoint);
-}
-
-void CustomComboBoxView::stopFlick()
-{
-    if (m_flickTimerId != 0) {
-        TouchClock::instance().stop(this, m_flickTimerId);
-        m_flickTimerId = 0;
-    }
-    m_autoFlick = false;
 }
 
 QPoint CustomComboBoxView::getDistance()
 {
-    return m_autoFlick ? getFlickDistance() : getDragDistance();
-}
-
-QPoint CustomComboBoxView::getFlickDistance()
-{
-    const FlickMotion::Step step = FlickMotion::flickStep(RULES, m_startPoint, m_endPoint);
-    m_startPoint = step.start.toPoint();
-    return QPoint(static_cast<int>(step.distance.x()), step.scroll);
-}
-
-QPoint CustomComboBoxView::getDragDistance()
-{
-    const FlickMotion::Step step = FlickMotion::dragStep(RULES, m_startPoint, m_endPoint);
-    m_startPoint = step.start.toPoint();
-    return QPoint(static_cast<int>(step.distance.x()), step.scroll);
+    return isAutoFilck() ? getFlickDistance() : getDragDistance();
 }
 
 void CustomComboBoxView::changeScrollBarValue(int offset)
 {
     QScrollBar* bar = verticalScrollBar();
-    m_scrollValue = FlickMotion::scrolledValue(m_scrollValue, offset, bar->minimum(), bar->maximum());
-    bar->setValue(m_scrollValue);
+    bar->setValue(FlickMotion::scrolledValue(bar->value(), offset, bar->minimum(), bar->maximum()));
 }
 
-void CustomComboBoxView::timerEvent(QTimerEvent* event)
+void CustomComboBoxView::showLastRowWhole()
 {
-    if (m_flickTimerId == 0 || event->timerId() != m_flickTimerId) {
-        QListView::timerEvent(event);
-        return;
-    }
-    const QScrollBar* bar = verticalScrollBar();
-    if (!isFlickEnd()) {
-        changeScrollBarValue(getDistance().y());
-        // A flick dies at the end of the list: the next touch is no brake.
-        if (m_autoFlick && FlickMotion::isAtLimit(bar->value(), bar->minimum(), bar->maximum())) {
-            stopFlick();
-        }
-        return;
-    }
-    if (bar->value() == bar->maximum()) {
-        stopFlick();
+    if (verticalScrollBar()->value() == verticalScrollBar()->maximum()) {
         scrollToBottom();
-    } else if (m_autoFlick) {
-        stopFlick();
     }
 }
 
 bool CustomComboBoxView::viewportEvent(QEvent* event)
 {
     switch (event->type()) {
-    case QEvent::TouchBegin:
-    case QEvent::TouchUpdate:
-    case QEvent::TouchEnd:
-    case QEvent::TouchCancel:
-        return onTouchEvent(static_cast<QTouchEvent*>(event));
     case QEvent::MouseButtonPress:
     case QEvent::MouseButtonDblClick:
     case QEvent::MouseMove:
@@ -242,7 +154,8 @@ bool CustomComboBoxView::viewportEvent(QEvent* event)
         stopFlick();
         return QListView::viewportEvent(event);
     default:
-        return QListView::viewportEvent(event);
+        return OneFinger::isTouch(event) ? onTouchEvent(static_cast<QTouchEvent*>(event))
+                                         : QListView::viewportEvent(event);
     }
 }
 

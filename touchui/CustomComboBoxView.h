@@ -1,5 +1,6 @@
 #pragma once
 
+#include "touchui/Flicker.h"
 #include "touchui/OneFinger.h"
 
 #include <QListView>
@@ -15,7 +16,6 @@ class CustomComboBoxView : public QListView
     Q_OBJECT
 public:
     explicit CustomComboBoxView(QWidget* parent = nullptr);
-    ~CustomComboBoxView() override;
 
     // The row under a finger that may yet become a tap; invalid otherwise.
     QModelIndex pressedIndex() const { return m_pressedIndex; }
@@ -32,17 +32,17 @@ public:
     // Ends it without a tap and without a flick.
     void cancelTouch();
 
-    virtual void setAutoFlick(bool on);
-    virtual void setStartPoint(const QPoint& point);
-    virtual void setEndPoint(const QPoint& point);
-    virtual bool isFlickEnd() const;
-    virtual bool hasFlicked() const { return m_hasFlicked; }
-    virtual void stopFlick();
-    virtual bool isAutoFilck() const { return m_autoFlick; }
+    virtual void setAutoFlick(bool on) { m_flicker.setGliding(on); }
+    virtual void setStartPoint(const QPoint& point) { m_flicker.setStart(point); }
+    virtual void setEndPoint(const QPoint& point) { m_flicker.setEnd(point); }
+    virtual bool isFlickEnd() const { return m_flicker.isEnd(); }
+    virtual bool hasFlicked() const { return m_flicker.hasFlicked(); }
+    virtual void stopFlick() { m_flicker.stop(); }
+    virtual bool isAutoFilck() const { return m_flicker.isGliding(); }
     // By how much the list moves in this tick; the start point moves along.
     virtual QPoint getDistance();
-    virtual QPoint getFlickDistance();
-    virtual QPoint getDragDistance();
+    virtual QPoint getFlickDistance() { return FlickMotion::pixels(m_flicker.glide()); }
+    virtual QPoint getDragDistance() { return FlickMotion::pixels(m_flicker.drag()); }
     // A positive offset moves the rows down.
     virtual void changeScrollBarValue(int offset);
 
@@ -52,7 +52,6 @@ Q_SIGNALS:
 
 protected:
     bool viewportEvent(QEvent* event) override;
-    void timerEvent(QTimerEvent* event) override;
     void paintEvent(QPaintEvent* event) override;
     void keyPressEvent(QKeyEvent* event) override;
     void hideEvent(QHideEvent* event) override;
@@ -62,19 +61,13 @@ protected:
 private:
     bool viewportMouseEvent(QEvent* event);
     void rest();
+    void showLastRowWhole();
     QPoint fingerPosition() const;
     void setPressedIndex(const QModelIndex& index);
 
-    QPoint m_startPoint;
-    QPoint m_endPoint;
     QPoint m_pressPoint;
-    int m_flickTimerId = 0; // 0 is not running
     QPersistentModelIndex m_pressedIndex;
     QPixmap m_separator;
     OneFinger m_finger{this};
-    int m_scrollValue = 0;
-    bool m_down = false;
-    bool m_autoFlick = false;
-    bool m_hasFlicked = false;
-    bool m_brake = false; // this touch stopped a flick
+    Flicker m_flicker{this, FlickMotion::comboList()};
 };

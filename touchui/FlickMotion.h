@@ -28,28 +28,30 @@ struct Rules {
     qreal restDistance =
         5.0;           // start and end this near to each other vertically, included: the motion is over
     int interval = 33; // milliseconds between two ticks
-    qreal flickDivisor = 30.0;  // the part of the way that the start point covers in a tick of a flick
-    int leastDrag = 0;          // a drag's vertical distance is never shorter than this; 0 turns that off
-    bool wholePixels = false;   // points have no fractions
-    bool leastStepBoth = false; // a flick moves the start point by at least a pixel horizontally, too
+    qreal flickDivisor = 30.0;     // the part of the way that the start point covers in a tick of a flick
+    int leastDrag = 0;             // a drag's vertical distance is never shorter than this; 0 turns that off
+    bool wholePixels = false;      // points have no fractions
+    bool leastStepBoth = false;    // a flick moves the start point by at least a pixel horizontally, too
+    bool dragStopsAtLimit = false; // at an end of the list a drag stops until the finger moves on
+    bool firstMoveScrolls = false; // the way to the first move of a finger counts
 };
 
 constexpr Rules scrollViewer()
 {
-    return {};
+    return {.dragStopsAtLimit = true};
 }
-// Also the combo boxes' lists.
 constexpr Rules treeView()
 {
     return {.leastDrag = 2, .wholePixels = true, .leastStepBoth = true};
 }
+// The lists of combo boxes.
+constexpr Rules comboList()
+{
+    return {.leastDrag = 2, .wholePixels = true, .leastStepBoth = true, .firstMoveScrolls = true};
+}
 constexpr Rules templateGrid()
 {
-    return {.wholePixels = true};
-}
-constexpr Rules fontList()
-{
-    return {.wholePixels = true};
+    return {.wholePixels = true, .dragStopsAtLimit = true};
 }
 
 // The item under the finger, in coordinates of the viewer that shows viewerHeight rows: a drag does not push
@@ -66,6 +68,12 @@ struct Step {
     int scroll = 0;       // the vertical part in whole pixels, truncated
     bool bounded = false; // the bounds shortened the way
 };
+
+// Without the fractions.
+constexpr QPoint pixels(const QPointF& distance)
+{
+    return QPoint(int(distance.x()), int(distance.y()));
+}
 
 bool isFlickEnd(const Rules& rules, const QPointF& start, const QPointF& end);
 // One tick with the finger down.

@@ -18,7 +18,6 @@
 #include <QProxyStyle>
 #include <QStandardItemModel>
 #include <QStyleOptionComboBox>
-#include <QTouchEvent>
 #include <QtMath>
 
 #include <algorithm>
@@ -85,6 +84,7 @@ KSCombobox::KSCombobox(QWidget* parent)
     setPalette(colors);
     setView(m_view);
     setItemDelegate(m_delegate);
+    connect(&m_finger, &OneFinger::acted, this, &KSCombobox::sendMouse);
     connect(&m_finger, &OneFinger::cancelled, this, &KSCombobox::comeUp);
     connect(m_view, &CustomComboBoxView::signalTapped, this, &KSCombobox::choose);
     setBackgroundImagesPath(QStringLiteral(":/TextToolPanel_TextBox/TextBox_Edittable"));
@@ -339,36 +339,11 @@ void KSCombobox::drawPopListTranslucent(QWidget* popup)
 
 bool KSCombobox::event(QEvent* event)
 {
-    switch (static_cast<int>(event->type())) {
-    case QEvent::TouchBegin:
-    case QEvent::TouchUpdate:
-    case QEvent::TouchEnd:
-    case QEvent::TouchCancel:
-        return onTouchEvent(static_cast<QTouchEvent*>(event));
-    case KSEventProcessLockObject::RestoreOriginalType:
+    if (event->type() == QEvent::Type(KSEventProcessLockObject::RestoreOriginalType)) {
         hidePopup();
         return true;
-    default:
-        return QComboBox::event(event);
     }
-}
-
-bool KSCombobox::onTouchEvent(QTouchEvent* event)
-{
-    switch (m_finger.follow(event)) {
-    case OneFinger::Step::Begin:
-        sendMouse(QEvent::MouseButtonPress);
-        break;
-    case OneFinger::Step::Move:
-        sendMouse(QEvent::MouseMove);
-        break;
-    case OneFinger::Step::End:
-        sendMouse(QEvent::MouseButtonRelease);
-        break;
-    case OneFinger::Step::None:
-        break;
-    }
-    return true;
+    return m_finger.takes(event) || QComboBox::event(event);
 }
 
 // The box comes up; a field that was pressed lets go without being clicked.
@@ -387,13 +362,10 @@ void KSCombobox::sendMouse(QEvent::Type type)
 {
     const QPoint position = m_finger.positionIn(this).toPoint();
     const QPoint globalPosition = m_finger.position().toPoint();
-    const Qt::MouseButtons held = type == QEvent::MouseButtonRelease ? Qt::NoButton : Qt::LeftButton;
-    QMouseEvent event(type, position, globalPosition,
-                      type == QEvent::MouseMove ? Qt::NoButton : Qt::LeftButton, held, Qt::NoModifier);
+    QMouseEvent event = OneFinger::mouseEvent(type, position, globalPosition);
     QLineEdit* edit = lineEdit();
     if (edit != nullptr && edit->geometry().contains(position)) {
-        QMouseEvent inEdit(type, edit->mapFrom(this, position), globalPosition, event.button(), held,
-                           Qt::NoModifier);
+        QMouseEvent inEdit = OneFinger::mouseEvent(type, edit->mapFrom(this, position), globalPosition);
         QCoreApplication::sendEvent(edit, &inEdit);
     } else if (type == QEvent::MouseButtonPress) {
         mousePressEvent(&event);

@@ -12,7 +12,6 @@
 class CustomComboBoxDelegate;
 class CustomComboBoxView;
 class OutsidePressFilter;
-class QTouchEvent;
 
 // A combo box for one finger, painted from pictures. Its list is a window of its own that closes by a choice,
 // by a press outside and when another process takes the touch; it is no popup of Qt's, so touches go on
@@ -84,7 +83,6 @@ private:
     void choose(const QModelIndex& index);
     void popupHidden();
     void setPressed(bool pressed);
-    bool onTouchEvent(QTouchEvent* event);
     void sendMouse(QEvent::Type type);
     void comeUp();
     int longestTextWidth() const;

@@ -4,6 +4,7 @@
 
 #include "messaging/services/ISoftKeyBoardController.h"
 #include "messaging/services/SubCommonDefine.h"
+#include "touchui/KeyReleaseWatch.h"
 
 #include <QEvent>
 #include <QPointer>
@@ -14,7 +15,7 @@
 #include <memory>
 #include <string>
 
-class QComboBox;
+class InputField;
 class QGraphicsTextItem;
 class QGraphicsView;
 class QInputMethodEvent;
@@ -29,9 +30,7 @@ struct xkb_context;
 // GUI thread only. Without a controller every operation that would talk to the service does nothing and the
 // physical keyboard works as usual, through the input method that the environment asks for.
 //
-// A field describes itself by its object name, "<keyboard type>#<title>#<selection mode>#<last value>" (the
-// last one or two parts may be missing); a text item by the eleven fields of tagSoftKeyBoardInitData in their
-// order.
+// A field describes itself by its object name, see FieldName.
 class KSInputContext : public QPlatformInputContext, public ISoftKeyBoardControllerCallBack
 {
     Q_OBJECT
@@ -39,14 +38,14 @@ public:
     // Chooses this class as the input context of the QApplication that is made next.
     static void install();
     // Null before QApplication, and when install() was not called.
-    static KSInputContext* instance();
+    static KSInputContext* instance() { return s_instance; }
 
     // Made by the plug-in. inner is the input method that serves the physical keyboard; may be null.
     explicit KSInputContext(std::unique_ptr<QPlatformInputContext> inner = nullptr);
     ~KSInputContext() override;
 
-    QString identifierName() const;
-    QString language() const;
+    QString identifierName() const { return QStringLiteral("KSInputContext"); }
+    QString language() const { return QString(); }
 
     // The service; not owned, null takes it away and leaves the keyboard closed.
     void setKeyBoardController(ISoftKeyBoardController* controller);
@@ -68,7 +67,7 @@ public:
     QWidget* focusWidget() const { return m_baseFocusWidget; }
     // Lets the next request look at the widget that has the focus now, instead of the one the keyboard was
     // opened for.
-    static void resetFocusWidget();
+    static void resetFocusWidget() { m_pFocusWidget.clear(); }
     // The widget that the keyboard works for: it outlives a change of focus while the keyboard is open.
     QWidget* getFocusWidget();
     // The text item of the view that is being edited, null when there is none.
@@ -76,7 +75,6 @@ public:
 
     SubCommonDefine::tagSoftKeyBoardInitData getSendData();
     SubCommonDefine::tagSoftKeyBoardInitData getSendData(QLineEdit* edit);
-    SubCommonDefine::tagSoftKeyBoardInitData getSendData(QGraphicsTextItem* item);
 
     // Opens the keyboard with a record of the caller's.
     void showSoftKeyBoardWindow(SubCommonDefine::tagSoftKeyBoardInitData data);
@@ -99,29 +97,31 @@ public:
     void sendEvent(const QInputMethodEvent& event);
 
     // What the service sends.
-    void sendInputString(std::wstring text) override;
-    void sendInputStringOnEnterPressing(std::wstring text) override;
+    void sendInputString(std::wstring text) override { handleInputString(text, false); }
+    void sendInputStringOnEnterPressing(std::wstring text) override { handleInputString(text, true); }
     void sendInputStringOnTextChanged(std::wstring text) override;
     void sendKey(SubCommonDefine::tagSoftKeyBoardKeyData data) override;
     void sendInputStringSelectionPos(SubCommonDefine::tagSoftKeyBoardKeyTextSelectionPos pos) override;
     // True tells that the keyboard is up.
-    void sendSoftKeyboardState(bool shown) override;
+    void sendSoftKeyboardState(bool shown) override { setClosed(!shown); }
 
     // The part of an input context that Qt calls.
-    bool isValid() const override;
-    bool hasCapability(Capability capability) const override;
-    void reset() override;
-    void commit() override;
-    void update(Qt::InputMethodQueries queries) override;
-    void invokeAction(QInputMethod::Action action, int cursorPosition) override;
+    bool isValid() const override { return true; }
+    bool hasCapability(Capability capability) const override { return m_inner->hasCapability(capability); }
+    void reset() override { m_inner->reset(); }
+    void commit() override { m_inner->commit(); }
+    void update(Qt::InputMethodQueries queries) override { m_inner->update(queries); }
+    void invokeAction(QInputMethod::Action action, int cursorPosition) override
+    {
+        m_inner->invokeAction(action, cursorPosition);
+    }
     void showInputPanel() override;
     void hideInputPanel() override;
-    bool isInputPanelVisible() const override;
+    bool isInputPanelVisible() const override { return !m_bClosed; }
     void setFocusObject(QObject* object) override;
     // Called by name while the X11 platform starts, for an inner method that composes.
     Q_INVOKABLE void setXkbContext(struct xkb_context* context);
     bool event(QEvent* event) override;
-    bool eventFilter(QObject* object, QEvent* event) override;
 
     static bool m_bClosed;
     static QPointer<QWidget> m_pFocusWidget;
@@ -130,25 +130,25 @@ public:
     static QEvent m_eKeyBoardClosed; // what a field gets when the keyboard was closed under it
 
 private:
-    bool filterKeyPressEvent(const QEvent* event);
+    bool filterKeyPressEvent(const QEvent* event) { return !m_bClosed && forwardKeyPress(event); }
     bool filterRequestSoftwareInputPanel();
     bool filterCloseSoftwareInputPanel();
     bool isErrorForGettingFocusWidget();
+    static SubCommonDefine::tagSoftKeyBoardInitData sendDataOf(const InputField* field);
     bool showForFocusWidget(const SubCommonDefine::tagSoftKeyBoardInitData& data);
     void handleInputString(const std::wstring& text, bool onEnter);
-    void handleInputStringOfQGraphicsView(QGraphicsView* view, const QString& text);
-    void handleInputStringOfQLineEdit(QLineEdit* edit, const QString& text, bool onEnter);
-    void handleInputStringOfQCombobox(QComboBox* box, const QString& text, bool onEnter);
-    void checkInputString(QLineEdit* edit, const QString& text);
+    void checkInputString(InputField& field, const std::wstring& text);
     void sendSoftKeyBoardClosedEventToFocusWidget();
-    void setCursorSelection(const SubCommonDefine::tagSoftKeyBoardKeyTextSelectionPos& pos, QLineEdit* edit);
+    bool isOpenAtService() const { return m_controller != nullptr && !m_bClosed; }
+    void showAtService(const SubCommonDefine::tagSoftKeyBoardInitData& data);
+    void closeAtOnce(void (ISoftKeyBoardController::*close)());
     void setClosed(bool closed);
 
     static KSInputContext* s_instance;
-    std::unique_ptr<QPlatformInputContext> m_inner;
+    std::unique_ptr<QPlatformInputContext> m_inner; // without an input method one that does nothing
     ISoftKeyBoardController* m_controller = nullptr;
     bool m_sendingKeyEvent = false;
     unsigned long m_windowId = 0;
     QPointer<QWidget> m_baseFocusWidget;
-    bool m_keyReleased = false; // the field is handling the release of a key
+    KeyReleaseWatch m_keyReleases;
 };

@@ -49,6 +49,11 @@ KSMenu::KSMenu(QWidget* parent, const QFont& font)
     }
     setFont(textFont);
     connect(m_outsidePress, &OutsidePressFilter::pressedOutside, this, &QWidget::close);
+    const auto place = [this] { return m_finger.positionIn(this).toPoint(); };
+    connect(&m_finger, &OneFinger::began, this, [this, place] { onMouseButtonPress(place()); });
+    connect(&m_finger, &OneFinger::moved, this, [this, place] { onMouseMove(place()); });
+    connect(&m_finger, &OneFinger::lifted, this,
+            [this, place] { onMouseButtonRelease(place(), Qt::LeftButton); });
     connect(&m_finger, &OneFinger::cancelled, this, [this] { setCurrent(-1); });
 }
 
@@ -239,18 +244,14 @@ bool KSMenu::event(QEvent* event)
             Q_EMIT signalMenuAboutToClose();
         }
         return QMenu::event(event);
-    case QEvent::TouchBegin:
-    case QEvent::TouchUpdate:
-    case QEvent::TouchEnd:
-    case QEvent::TouchCancel:
-        return onTouchEvent(static_cast<QTouchEvent*>(event));
     case QEvent::MouseButtonPress:
     case QEvent::MouseButtonDblClick:
     case QEvent::MouseMove:
     case QEvent::MouseButtonRelease:
         return onMouseEvent(event);
     default:
-        return QMenu::event(event);
+        return (OneFinger::isTouch(event) && onTouchEvent(static_cast<QTouchEvent*>(event))) ||
+               QMenu::event(event);
     }
 }
 
@@ -273,19 +274,7 @@ bool KSMenu::onMouseEvent(QEvent* event)
 
 bool KSMenu::onTouchEvent(QTouchEvent* event)
 {
-    switch (m_finger.follow(event)) {
-    case OneFinger::Step::Begin:
-        onMouseButtonPress(m_finger.positionIn(this).toPoint());
-        break;
-    case OneFinger::Step::Move:
-        onMouseMove(m_finger.positionIn(this).toPoint());
-        break;
-    case OneFinger::Step::End:
-        onMouseButtonRelease(m_finger.positionIn(this).toPoint(), Qt::LeftButton);
-        break;
-    case OneFinger::Step::None:
-        break;
-    }
+    m_finger.follow(event);
     return true;
 }
 

@@ -30,6 +30,15 @@ public:
     };
     using enumButtonState = _enumButtonState;
 
+    // The picture string of the standard button, 48 pixels high.
+    static constexpr char STANDARD_IMAGES[] =
+        "TextToolPanel_Buttons:Button_48_Rest_Left:Button_48_Rest_Center:Button_48_Rest_Right:"
+        "Button_48_Pressed_Left:Button_48_Pressed_Center:Button_48_Pressed_Right:"
+        "Button_48_Disabled_Left:Button_48_Disabled_Center:Button_48_Disabled_Right:"
+        "Button_48selected_Rest_Left:Button_48selected_Rest_Center:Button_48selected_Rest_Right:"
+        "Button_48selected_Pressed_Left:Button_48selected_Pressed_Center:Button_48selected_Pressed_Right:"
+        "Button_48selected_Disabled_Left:Button_48selected_Disabled_Center:Button_48selected_Disabled_Right";
+
     explicit KSPushbutton(const QString& images, QWidget* parent = nullptr);
     KSPushbutton(const QString& images, const QString& text, QWidget* parent = nullptr);
     explicit KSPushbutton(QWidget* parent = nullptr);

@@ -2,7 +2,6 @@
 
 #include <QMouseEvent>
 #include <QPainter>
-#include <QTouchEvent>
 
 namespace
 {
@@ -30,6 +29,8 @@ void KSRadiobutton::init()
 {
     setAttribute(Qt::WA_AcceptTouchEvents);
     setFocusPolicy(Qt::NoFocus);
+    connect(&m_finger, &OneFinger::acted, this,
+            [this](QEvent::Type type) { sendMouse(type, m_finger.positionIn(this)); });
     connect(&m_finger, &OneFinger::cancelled, this, &KSRadiobutton::comeUp);
     QFont textFont = font();
     textFont.setPixelSize(TEXT_PIXELS);
@@ -74,41 +75,13 @@ bool KSRadiobutton::hitButton(const QPoint& position) const
 
 bool KSRadiobutton::event(QEvent* event)
 {
-    switch (event->type()) {
-    case QEvent::TouchBegin:
-    case QEvent::TouchUpdate:
-    case QEvent::TouchEnd:
-    case QEvent::TouchCancel:
-        return onTouchEvent(static_cast<QTouchEvent*>(event));
-    default:
-        return QRadioButton::event(event);
-    }
-}
-
-bool KSRadiobutton::onTouchEvent(QTouchEvent* event)
-{
-    switch (m_finger.follow(event)) {
-    case OneFinger::Step::Begin:
-        sendMouse(QEvent::MouseButtonPress, m_finger.positionIn(this));
-        break;
-    case OneFinger::Step::Move:
-        sendMouse(QEvent::MouseMove, m_finger.positionIn(this));
-        break;
-    case OneFinger::Step::End:
-        sendMouse(QEvent::MouseButtonRelease, m_finger.positionIn(this));
-        break;
-    case OneFinger::Step::None:
-        break;
-    }
-    return true;
+    return m_finger.takes(event) || QRadioButton::event(event);
 }
 
 void KSRadiobutton::sendMouse(QEvent::Type type, const QPointF& position)
 {
     const QPoint place = position.toPoint();
-    const Qt::MouseButtons held = type == QEvent::MouseButtonRelease ? Qt::NoButton : Qt::LeftButton;
-    QMouseEvent event(type, place, mapToGlobal(place),
-                      type == QEvent::MouseMove ? Qt::NoButton : Qt::LeftButton, held, Qt::NoModifier);
+    QMouseEvent event = OneFinger::mouseEvent(type, place, mapToGlobal(place));
     if (type == QEvent::MouseButtonPress) {
         mousePressEvent(&event);
     } else if (type == QEvent::MouseMove) {

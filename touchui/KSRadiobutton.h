@@ -8,8 +8,6 @@
 
 #include <array>
 
-class QTouchEvent;
-
 // A radio button for one finger, painted from the pictures under ":/KSRadioButton" or another folder:
 // Radiobutton_On_Rest, Radiobutton_On_Pressed, Radiobutton_On_Disabled and the same with Off.
 class KSRadiobutton : public QRadioButton
@@ -32,7 +30,6 @@ protected:
 
 private:
     void init();
-    bool onTouchEvent(QTouchEvent* event);
     void sendMouse(QEvent::Type type, const QPointF& position);
     void comeUp();
     QSize pictureSize() const;

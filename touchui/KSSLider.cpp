@@ -8,7 +8,6 @@
 #include <QPainter>
 #include <QStringList>
 #include <QStyleOptionSlider>
-#include <QTouchEvent>
 
 namespace
 {
@@ -29,6 +28,7 @@ KSSLider::KSSLider(const QString& images, Qt::Orientation orientation, QWidget* 
     setStyle(m_style);
     setAttribute(Qt::WA_AcceptTouchEvents);
     setFocusPolicy(Qt::NoFocus);
+    connect(&m_finger, &OneFinger::acted, this, &KSSLider::sendMouse);
     connect(&m_finger, &OneFinger::cancelled, this, &KSSLider::letGo);
     Initialization(images, orientation);
 }
@@ -122,42 +122,18 @@ QSize KSSLider::minimumSizeHint() const
 bool KSSLider::event(QEvent* event)
 {
     switch (event->type()) {
-    case QEvent::TouchBegin:
-    case QEvent::TouchUpdate:
-    case QEvent::TouchEnd:
-    case QEvent::TouchCancel:
-        return onTouchEvent(static_cast<QTouchEvent*>(event));
     case QEvent::KeyPress:
     case QEvent::KeyRelease:
         return true;
     default:
-        return QSlider::event(event);
+        return m_finger.takes(event) || QSlider::event(event);
     }
-}
-
-bool KSSLider::onTouchEvent(QTouchEvent* event)
-{
-    switch (m_finger.follow(event)) {
-    case OneFinger::Step::Begin:
-        sendMouse(QEvent::MouseButtonPress);
-        break;
-    case OneFinger::Step::Move:
-        sendMouse(QEvent::MouseMove);
-        break;
-    case OneFinger::Step::End:
-        sendMouse(QEvent::MouseButtonRelease);
-        break;
-    case OneFinger::Step::None:
-        break;
-    }
-    return true;
 }
 
 void KSSLider::sendMouse(QEvent::Type type)
 {
-    const Qt::MouseButtons held = type == QEvent::MouseButtonRelease ? Qt::NoButton : Qt::LeftButton;
-    QMouseEvent event(type, m_finger.positionIn(this).toPoint(), m_finger.position().toPoint(),
-                      type == QEvent::MouseMove ? Qt::NoButton : Qt::LeftButton, held, Qt::NoModifier);
+    QMouseEvent event =
+        OneFinger::mouseEvent(type, m_finger.positionIn(this).toPoint(), m_finger.position().toPoint());
     if (type == QEvent::MouseButtonPress) {
         mousePressEvent(&event);
     } else if (type == QEvent::MouseMove) {

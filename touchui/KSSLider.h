@@ -8,7 +8,6 @@
 #include <QSlider>
 
 class KSSliderStyle;
-class QTouchEvent;
 
 // A slider for one finger: touches become mouse events of the slider, its handle keeps its distance to the
 // finger, and a balloon tells the value while it is held. Positions are in widget coordinates.
@@ -65,7 +64,6 @@ protected:
     void initStyleOption(QStyleOptionSlider* option) const override;
 
 private:
-    bool onTouchEvent(QTouchEvent* event);
     void sendMouse(QEvent::Type type);
     void letGo();
     int valueAt(const QPoint& position) const;

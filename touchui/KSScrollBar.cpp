@@ -1,12 +1,10 @@
 #include "touchui/KSScrollBar.h"
 
-#include <QEventPoint>
 #include <QKeyEvent>
 #include <QMouseEvent>
 #include <QPainter>
 #include <QStyle>
 #include <QStyleOptionSlider>
-#include <QTouchEvent>
 
 KSScrollBar::KSScrollBar(QWidget* parent) : QScrollBar(parent)
 {
@@ -22,51 +20,26 @@ void KSScrollBar::init()
 {
     setAttribute(Qt::WA_AcceptTouchEvents);
     setFocusPolicy(Qt::NoFocus);
+    connect(&m_finger, &OneFinger::acted, this, &KSScrollBar::followFinger);
     connect(&m_finger, &OneFinger::cancelled, this, &KSScrollBar::letGo);
 }
 
 bool KSScrollBar::event(QEvent* event)
 {
-    switch (event->type()) {
-    case QEvent::TouchBegin:
-    case QEvent::TouchUpdate:
-    case QEvent::TouchEnd:
-    case QEvent::TouchCancel:
-        return handleTouch(static_cast<QTouchEvent*>(event));
-    case QEvent::ContextMenu:
-        return true;
-    default:
-        return QScrollBar::event(event);
-    }
+    return event->type() == QEvent::ContextMenu || m_finger.takes(event) || QScrollBar::event(event);
 }
 
-bool KSScrollBar::handleTouch(const QTouchEvent* event)
+// The place of a press or move is cut to whole pixels, that of a lift is rounded.
+void KSScrollBar::followFinger(QEvent::Type type)
 {
-    const OneFinger::Step step = m_finger.follow(event);
     const QPointF exact = m_finger.positionIn(this);
     const QPoint cut(static_cast<int>(exact.x()), static_cast<int>(exact.y()));
-    switch (step) {
-    case OneFinger::Step::Begin:
-        sendMouse(QEvent::MouseButtonPress, cut);
-        break;
-    case OneFinger::Step::Move:
-        sendMouse(QEvent::MouseMove, cut);
-        break;
-    case OneFinger::Step::End:
-        sendMouse(QEvent::MouseButtonRelease, exact.toPoint());
-        break;
-    case OneFinger::Step::None:
-        break;
-    }
-    return true;
+    sendMouse(type, type == QEvent::MouseButtonRelease ? exact.toPoint() : cut);
 }
 
 void KSScrollBar::sendMouse(QEvent::Type type, const QPoint& position)
 {
-    const bool held = type != QEvent::MouseButtonRelease;
-    QMouseEvent mouse(type, position, mapToGlobal(position),
-                      type == QEvent::MouseMove ? Qt::NoButton : Qt::LeftButton,
-                      held ? Qt::LeftButton : Qt::NoButton, Qt::NoModifier);
+    QMouseEvent mouse = OneFinger::mouseEvent(type, position, mapToGlobal(position));
     if (type == QEvent::MouseButtonPress)
         mousePressEvent(&mouse);
     else if (type == QEvent::MouseMove)

@@ -7,7 +7,6 @@
 #include <QScrollBar>
 
 class QPainter;
-class QTouchEvent;
 
 // A scroll bar that paints itself from pictures and that a finger works like a mouse. GUI thread only.
 class KSScrollBar : public QScrollBar
@@ -43,7 +42,7 @@ private:
     void init();
     const Handle& handlePictures();
     const QPixmap& base();
-    bool handleTouch(const QTouchEvent* event);
+    void followFinger(QEvent::Type type);
     void sendMouse(QEvent::Type type, const QPoint& position);
     void letGo();
 

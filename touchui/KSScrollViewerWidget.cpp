@@ -1,15 +1,16 @@
-// Items, layout and scroll bar of the list; what fingers do to it is in KSScrollViewerTouch.cpp.
 #include "touchui/KSScrollViewerWidget.h"
 
 #include "touchui/KSScrollBar.h"
 #include "touchui/ScrollViewerBoard.h"
-#include "touchui/ScrollViewerDrag.h"
 
+#include <QEventPoint>
 #include <QKeyEvent>
+#include <QMouseEvent>
 #include <QPaintEvent>
 #include <QPainter>
 #include <QResizeEvent>
 #include <QScopedValueRollback>
+#include <QTouchEvent>
 #include <QWheelEvent>
 
 namespace
@@ -36,10 +37,7 @@ QString KSScrollViewerWidget::s_scrollBarStyle =
     QStringLiteral("QScrollArea { background-color: rgb(51, 51, 51); border: 0px; }");
 
 KSScrollViewerWidget::KSScrollViewerWidget(QWidget* parent)
-    : QScrollArea(parent)
-    , m_board(new ScrollViewerBoard(this))
-    , m_flick(this)
-    , m_drag(std::make_unique<ScrollViewerDrag>(*m_board))
+    : QScrollArea(parent), m_board(new ScrollViewerBoard(this)), m_touch(*this, *m_board)
 {
     setFrameShape(QFrame::NoFrame);
     setStyleSheet(s_scrollBarStyle);
@@ -50,12 +48,7 @@ KSScrollViewerWidget::KSScrollViewerWidget(QWidget* parent)
     setWidget(m_board->panel());
     buildBars();
 
-    m_press.hold.setSingleShot(true);
-    m_press.popup.setSingleShot(true);
-    connect(&m_finger, &OneFinger::cancelled, this, &KSScrollViewerWidget::rest);
-    connect(&m_press.hold, &TouchTimer::timeout, this, &KSScrollViewerWidget::slotHandleMenuTimer);
-    connect(&m_press.popup, &TouchTimer::timeout, this, &KSScrollViewerWidget::slotShowPopupItem);
-    connect(&m_drag->edgeTimer, &TouchTimer::timeout, this, &KSScrollViewerWidget::slotHandleMoveTimer);
+    connectTouch();
     connect(&m_stretchTimer, &TouchTimer::timeout, this, &KSScrollViewerWidget::slotHandleStretchTimer);
     connect(m_board, &ScrollViewerBoard::itemDestroyed, this, &KSScrollViewerWidget::itemGone);
     connect(m_board, &ScrollViewerBoard::itemMade, this, &KSScrollViewerWidget::itemMade);
@@ -74,7 +67,37 @@ KSScrollViewerWidget::~KSScrollViewerWidget()
     disconnect(m_board, nullptr, this, nullptr);
     for (KSBaseItemWidget* item : m_board->widgets())
         disconnectItem(item);
-    m_drag.reset();
+    m_touch.abandonDrag();
+}
+
+void KSScrollViewerWidget::connectTouch()
+{
+    connect(&m_touch.flicker(), &Flicker::ticked, this,
+            [this] { m_touch.scrollBy(static_cast<int>(getDistance().y())); });
+    const auto relay = [this](auto from, auto to) {
+        connect(&m_touch, from, this, [this, to](KSBaseItemWidget* item, QPoint pos) {
+            Q_EMIT(this->*to)(item, pos, this);
+        });
+    };
+    relay(&ScrollViewerTouch::pressed, &KSScrollViewerWidget::widgetItemPressed);
+    relay(&ScrollViewerTouch::rightPressed, &KSScrollViewerWidget::widgetItemRightPressed);
+    relay(&ScrollViewerTouch::held, &KSScrollViewerWidget::widgetItemLongHold);
+    relay(&ScrollViewerTouch::movedOver, &KSScrollViewerWidget::widgetItemMouseMove);
+    relay(&ScrollViewerTouch::released, &KSScrollViewerWidget::widgetItemReleased);
+    relay(&ScrollViewerTouch::releasedAfterMotion, &KSScrollViewerWidget::widgetItemChangeColor);
+    relay(&ScrollViewerTouch::clicked, &KSScrollViewerWidget::widgetItemClicked);
+    connect(&m_touch, &ScrollViewerTouch::flicked, this,
+            [this](KSBaseItemWidget* item, QPoint pos, bool& willFlick) {
+                Q_EMIT signalFlick(item, pos, this, willFlick);
+            });
+    connect(&m_touch, &ScrollViewerTouch::mouseDrags, &m_stretchTimer, &TouchTimer::stop);
+    connect(&m_touch, &ScrollViewerTouch::dragStarts, this,
+            [this](KSBaseItemWidget* item, int index) { Q_EMIT signalDragOneItem(item, index, this); });
+    connect(&m_touch, &ScrollViewerTouch::dragStarted, this, &KSScrollViewerWidget::signalVisibleItemsChange);
+    connect(&m_touch, &ScrollViewerTouch::dropped, this, [this] {
+        adjustLayout();
+        Q_EMIT signalItemDrop();
+    });
 }
 
 void KSScrollViewerWidget::buildBars()
@@ -149,11 +172,6 @@ void KSScrollViewerWidget::setMargins(int left, int top, int right, int bottom)
     setMargins(QMargins(left, top, right, bottom));
 }
 
-void KSScrollViewerWidget::setItemsDragFlagAlignment(DragFlagAlignment alignment)
-{
-    m_dragAlignment = alignment;
-}
-
 void KSScrollViewerWidget::setScrollBarAutoShow(bool autoShow)
 {
     m_barAutoShow = autoShow;
@@ -166,23 +184,17 @@ void KSScrollViewerWidget::setHasSeparator(bool hasSeparator)
     m_board->board()->update();
 }
 
-void KSScrollViewerWidget::setHEffectiveArea(int left, int width)
-{
-    m_effectiveLeft = left;
-    m_effectiveWidth = width;
-}
-
 void KSScrollViewerWidget::connectItem(KSBaseItemWidget* item)
 {
     if (item->getDragFlagAlignment() == DRAGFLAG_NONE)
-        item->setDragFlagAlignment(m_dragAlignment);
+        item->setDragFlagAlignment(m_touch.dragAlignment());
     item->setAttribute(Qt::WA_AcceptTouchEvents);
     item->installEventFilter(this);
     connect(item, &KSBaseItemWidget::signalResize, this, &KSScrollViewerWidget::slotHandleItemSizeChange,
             Qt::UniqueConnection);
     connect(item, &KSBaseItemWidget::signalStartMove, this, &KSScrollViewerWidget::slotStartDrag,
             Qt::UniqueConnection);
-    if (m_itemsCanDrag)
+    if (m_touch.itemsCanDrag())
         item->setDragFlag(true);
     item->show();
 }
@@ -197,8 +209,8 @@ void KSScrollViewerWidget::addWidgetItem(KSBaseItemWidget* item, int index)
 {
     if (!item || m_board->indexOf(item) >= 0)
         return;
-    if (m_drag->item() == item)
-        abandonDrag();
+    if (m_touch.liftedItem() == item)
+        m_touch.abandonDrag();
     m_board->insert(item, index);
     connectItem(item);
     adjustLayout();
@@ -211,7 +223,7 @@ void KSScrollViewerWidget::addWidgetItems(QList<KSBaseItemWidget*>* items, int i
     if (index < 0 || index > count())
         index = count();
     for (KSBaseItemWidget* item : *items) {
-        if (!item || m_board->indexOf(item) >= 0 || m_drag->item() == item)
+        if (!item || m_board->indexOf(item) >= 0 || m_touch.liftedItem() == item)
             continue;
         m_board->insert(item, index++);
         connectItem(item);
@@ -241,7 +253,7 @@ bool KSScrollViewerWidget::giveBackWidgetItem(KSBaseItemWidget* item)
 {
     const int index = m_board->indexOf(item);
     const bool isShown = index >= m_firstVisible && index <= m_lastVisible;
-    if (!m_board->row(index) || isShown || m_press.item == item || m_finger.receiver() == item)
+    if (!m_board->row(index) || isShown || m_touch.isUsing(item))
         return false;
     disconnectItem(item);
     m_board->giveBack(item);
@@ -261,10 +273,10 @@ KSBaseItemWidget* KSScrollViewerWidget::madeWidgetItem(int index) const
 
 void KSScrollViewerWidget::removeWidgetItem(KSBaseItemWidget* item)
 {
-    if (item && m_drag->item() == item) {
-        abandonDrag();
+    if (item && m_touch.liftedItem() == item) {
+        m_touch.abandonDrag();
         disconnectItem(item);
-        breakTouchOf(item);
+        m_touch.breakTouchOf(item);
         adjustLayout();
         return;
     }
@@ -300,12 +312,7 @@ void KSScrollViewerWidget::takeOut(int index, int count)
     for (KSBaseItemWidget* item : m_board->take(index, count)) {
         disconnectItem(item);
         item->hide();
-        if (m_press.item == item) {
-            m_press.clearItem();
-            m_press.stopTimers();
-            m_press.drop();
-        }
-        breakTouchOf(item);
+        m_touch.forget(item);
     }
 }
 
@@ -316,10 +323,10 @@ void KSScrollViewerWidget::removeWidgetItems(KSBaseItemWidget* item, int count)
 
 void KSScrollViewerWidget::removeAll()
 {
-    if (KSBaseItemWidget* lifted = m_drag->item()) {
-        abandonDrag();
+    if (KSBaseItemWidget* lifted = m_touch.liftedItem()) {
+        m_touch.abandonDrag();
         disconnectItem(lifted);
-        breakTouchOf(lifted);
+        m_touch.breakTouchOf(lifted);
     }
     if (isEmpty())
         adjustLayout();
@@ -408,29 +415,9 @@ int KSScrollViewerWidget::getInsertPos(QPoint pos) const
     return index;
 }
 
-KSBaseItemWidget* KSScrollViewerWidget::getSelectedItem() const
-{
-    return m_press.item;
-}
-
-KSBaseItemWidget* KSScrollViewerWidget::getMoveItem() const
-{
-    return m_drag->moving();
-}
-
-bool KSScrollViewerWidget::isDragging() const
-{
-    return m_drag->isActive();
-}
-
 QPoint KSScrollViewerWidget::toBoard(const QPoint& pos) const
 {
     return m_board->board()->mapFrom(this, pos);
-}
-
-bool KSScrollViewerWidget::isTall() const
-{
-    return m_board->board()->height() > height();
 }
 
 // With items of no fixed size a relayout resizes them, and they ask for one in turn.
@@ -478,18 +465,11 @@ void KSScrollViewerWidget::slotScrollBarShowOrHide(int minimum, int maximum)
 void KSScrollViewerWidget::slotSetScrollBarValue(int value)
 {
     verticalScrollBar()->setValue(value);
-    m_scrollValue = verticalScrollBar()->value();
-    m_savedValue = m_scrollValue;
-    m_bar->setValue(m_scrollValue);
+    m_savedValue = verticalScrollBar()->value();
+    m_bar->setValue(m_savedValue);
     refreshVisible();
-    if (m_drag->isActive())
-        updateIndicator();
-}
-
-void KSScrollViewerWidget::changeScrollBarValue(int offset)
-{
-    slotSetScrollBarValue(
-        FlickMotion::scrolledValue(m_scrollValue, offset, m_bar->minimum(), m_bar->maximum()));
+    if (isDragging())
+        m_touch.updateIndicator();
 }
 
 void KSScrollViewerWidget::refreshVisible()
@@ -530,7 +510,6 @@ void KSScrollViewerWidget::setLastVisibleItem(KSBaseItemWidget* item)
 void KSScrollViewerWidget::wheelEvent(QWheelEvent* event)
 {
     stopFlick();
-    m_barPressed = true;
     m_stretchTimer.stop();
     refreshVisible();
     event->accept();
@@ -611,13 +590,7 @@ void KSScrollViewerWidget::slotChangeScrollBarStyle(int minimum, int maximum)
 
 void KSScrollViewerWidget::slotScrollBarSliderPressed()
 {
-    m_barPressed = true;
     m_stretchTimer.stop();
-}
-
-bool KSScrollViewerWidget::setMinitrimStatus(bool status)
-{
-    return std::exchange(m_minitrim, status);
 }
 
 void KSScrollViewerWidget::slotHandleStretchTimer()
@@ -626,4 +599,89 @@ void KSScrollViewerWidget::slotHandleStretchTimer()
     if (item && verticalScrollBar()->value() != verticalScrollBar()->maximum())
         slotSetScrollBarValue(item->y());
     Q_EMIT minitrimStop();
+}
+
+bool KSScrollViewerWidget::eventFilter(QObject* object, QEvent* event)
+{
+    if (object == m_bar)
+        return handleVScrollBarEvent(event);
+    if (object == m_board->board() && event->type() == QEvent::Paint) {
+        QPainter painter(m_board->board());
+        if (m_hasSeparator)
+            m_board->paintSeparators(painter, static_cast<QPaintEvent*>(event)->rect());
+        return true;
+    }
+    if (object == m_board->board() && event->type() == QEvent::LayoutRequest)
+        adjustLayout(); // an item wants another size
+    if (event->type() == QEvent::Gesture)
+        return object == this || object == viewport();
+    if (OneFinger::isTouch(event))
+        return m_touch.take(object, static_cast<QTouchEvent*>(event));
+    return QScrollArea::eventFilter(object, event);
+}
+
+bool KSScrollViewerWidget::handleVScrollBarEvent(QEvent* event)
+{
+    switch (event->type()) {
+    case QEvent::Wheel:
+        wheelEvent(static_cast<QWheelEvent*>(event));
+        return true;
+    case QEvent::ContextMenu:
+        return true;
+    case QEvent::MouseButtonPress:
+    case QEvent::TouchBegin:
+        stopFlick();
+        refreshVisible();
+        handleScrollBarPressedEvent(event);
+        return false;
+    default:
+        return false;
+    }
+}
+
+// Beside the handle the list jumps, so that the handle comes under the press and can be dragged on from
+// there.
+void KSScrollViewerWidget::handleScrollBarPressedEvent(QEvent* event)
+{
+    slotScrollBarSliderPressed();
+    const QList<QEventPoint>& points = static_cast<QPointerEvent*>(event)->points();
+    if (points.isEmpty())
+        return;
+    const int y = m_bar->mapFromGlobal(points.constFirst().globalPosition().toPoint()).y();
+    const QRect handle = m_bar->handleRect();
+    if (y >= handle.top() && y <= handle.bottom())
+        m_bar->update();
+    else
+        slotSetScrollBarValue(
+            static_cast<int>(qint64(y) * m_board->board()->height() / qMax(height(), 1) - height() / 2));
+}
+
+void KSScrollViewerWidget::hideEvent(QHideEvent* event)
+{
+    m_touch.rest();
+    QScrollArea::hideEvent(event);
+}
+
+void KSScrollViewerWidget::mousePressEvent(QMouseEvent* event)
+{
+    m_touch.mousePressed(event);
+    event->accept();
+}
+
+void KSScrollViewerWidget::mouseMoveEvent(QMouseEvent* event)
+{
+    event->accept();
+    m_touch.mouseMoved(event);
+}
+
+void KSScrollViewerWidget::mouseReleaseEvent(QMouseEvent* event)
+{
+    event->accept();
+    m_touch.mouseReleased(event);
+}
+
+void KSScrollViewerWidget::allTimersReset()
+{
+    m_stretchTimer.restartIfActive();
+    m_touch.restartTimers();
 }

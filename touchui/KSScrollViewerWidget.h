@@ -1,10 +1,9 @@
 #pragma once
 
 #include "touchui/KSBaseItemWidget.h"
-#include "touchui/OneFinger.h"
-#include "touchui/ScrollViewerFlick.h"
-#include "touchui/ScrollViewerPress.h"
 #include "touchui/ScrollViewerRow.h"
+#include "touchui/ScrollViewerTouch.h"
+#include "touchui/TouchTimer.h"
 
 #include <QList>
 #include <QMargins>
@@ -15,13 +14,11 @@
 #include <QScrollArea>
 
 #include <memory>
-#include <optional>
 #include <vector>
 
 class KSScrollBar;
 class QTouchEvent;
 class ScrollViewerBoard;
-class ScrollViewerDrag;
 
 // A vertical list of items for one finger, which taps or holds an item, scrolls the list and flicks it on,
 // or, by an item's handle, lifts the item out and drops it at another place.
@@ -52,7 +49,10 @@ public:
     virtual void setMargins(QMargins margins);
     virtual void setMargins(int left, int top, int right, int bottom);
     // For items that have none of their own.
-    virtual void setItemsDragFlagAlignment(DragFlagAlignment alignment);
+    virtual void setItemsDragFlagAlignment(DragFlagAlignment alignment)
+    {
+        m_touch.setDragAlignment(alignment);
+    }
     // The bar shows only while there is something to scroll to.
     virtual void setScrollBarAutoShow(bool autoShow);
     virtual void setHasSeparator(bool hasSeparator);
@@ -88,28 +88,37 @@ public:
     virtual void setLastVisibleItem(int index);
     virtual void setLastVisibleItem(KSBaseItemWidget* item);
     // The widget that floats under the finger; null when nothing is lifted.
-    virtual KSBaseItemWidget* getMoveItem() const;
+    virtual KSBaseItemWidget* getMoveItem() const { return m_touch.movingWidget(); }
     // Switched off, the list does not follow the finger that is down; the next touch switches it on.
-    virtual void setFlickAbility(bool ability);
+    virtual void setFlickAbility(bool ability) { m_touch.flicker().setAble(ability); }
     // Presses beside it, in widget coordinates, select nothing.
-    virtual void setHEffectiveArea(int left, int width);
-    virtual void onTranslateTouchEventToMouse(QObject* object, QTouchEvent* event);
-    virtual void onTranslateTouchBeginEventToMouse(QObject* object, QTouchEvent* event, QPoint& pos);
-    virtual void onTranslateTouchUpdateEventToMouse(QObject* object, QTouchEvent* event, QPoint& pos);
-    virtual void onTranslateTouchEndEventToMouse(QObject* object, QTouchEvent* event, QPoint& pos);
+    virtual void setHEffectiveArea(int left, int width) { m_touch.setEffectiveArea(left, width); }
+    virtual void onTranslateTouchEventToMouse(QObject*, QTouchEvent*) { m_touch.passOnAsMouse(); }
+    virtual void onTranslateTouchBeginEventToMouse(QObject*, QTouchEvent*, QPoint& pos)
+    {
+        m_touch.fingerPressed(pos);
+    }
+    virtual void onTranslateTouchUpdateEventToMouse(QObject*, QTouchEvent*, QPoint& pos)
+    {
+        m_touch.fingerMoved(pos);
+    }
+    virtual void onTranslateTouchEndEventToMouse(QObject*, QTouchEvent*, QPoint& pos)
+    {
+        m_touch.fingerLifted(pos);
+    }
     // Follows the finger. True when the event belongs to the motion and goes no further.
-    virtual bool onTouchEvent(QObject* object, QTouchEvent* event);
+    virtual bool onTouchEvent(QObject*, QTouchEvent*) { return m_touch.followMotion(); }
     // One tick: how far the contents move.
-    virtual QPointF getDistance();
-    virtual void setAutoFlick(bool autoFlick);
-    virtual void setStartPoint(const QPointF& point);
-    virtual void setEndPoint(const QPointF& point);
-    virtual bool isFlickEnd() const;
-    virtual bool hasFlicked() const;
-    virtual void stopFlick();
+    virtual QPointF getDistance() { return m_touch.getDistance(); }
+    virtual void setAutoFlick(bool autoFlick) { m_touch.flicker().setGliding(autoFlick); }
+    virtual void setStartPoint(const QPointF& point) { m_touch.flicker().setStart(point); }
+    virtual void setEndPoint(const QPointF& point) { m_touch.flicker().setEnd(point); }
+    virtual bool isFlickEnd() const { return m_touch.flicker().isEnd(); }
+    virtual bool hasFlicked() const { return m_touch.flicker().hasFlicked(); }
+    virtual void stopFlick() { m_touch.flicker().stop(); }
     // The list runs on after the finger has left.
-    virtual bool isAutoFilck() const;
-    virtual bool flickAbility() const;
+    virtual bool isAutoFilck() const { return m_touch.flicker().isGliding(); }
+    virtual bool flickAbility() const { return m_touch.flicker().isAble(); }
 
     KSBaseItemWidget* getWidgetItem(int index) const;
     // Null when there is no such row or its widget is not made.
@@ -130,38 +139,38 @@ public:
     // The index of an item that is inserted at this place, in widget coordinates.
     int getInsertPos(QPoint pos) const;
     // The item of the last press.
-    KSBaseItemWidget* getSelectedItem() const;
+    KSBaseItemWidget* getSelectedItem() const { return m_touch.pressedItem(); }
     // Items that are at least partly to be seen; -1 when there are none.
     int firstVisibleItem() const { return m_firstVisible; }
     int lastVisibleItem() const { return m_lastVisible; }
-    bool isMove() const;
-    bool isDragging() const;
+    bool isMove() const { return m_touch.flicker().isMove(); }
+    bool isDragging() const { return m_touch.isDragging(); }
     // Restarts those timers of press and drag that run.
     void allTimersReset();
-    void stopTapAndHoldTimer();
+    void stopTapAndHoldTimer() { m_touch.stopHold(); }
     KSScrollBar* getVScrollBar() const { return m_bar; }
     Qt::Alignment getVScrollBarAlignment() const { return m_barAlignment; }
     bool getHasSeparator() const { return m_hasSeparator; }
     // Gives the old one.
-    bool setMinitrimStatus(bool status);
+    bool setMinitrimStatus(bool status) { return m_touch.setMinitrimStatus(status); }
     // While set, a touch is left to the item under it.
-    void setIsTake(bool isTake) { m_isTake = isTake; }
-    bool itemsCanDrag() const { return m_itemsCanDrag; }
+    void setIsTake(bool isTake) { m_touch.setIsTake(isTake); }
+    bool itemsCanDrag() const { return m_touch.itemsCanDrag(); }
 
     bool eventFilter(QObject* object, QEvent* event) override;
 
 public Q_SLOTS:
-    void slotStartDrag(KSBaseItemWidget* item);
-    void slotItemsCanDrag(bool canDrag);
+    void slotStartDrag(KSBaseItemWidget* item) { m_touch.startDrag(item); }
+    void slotItemsCanDrag(bool canDrag) { m_touch.setItemsCanDrag(canDrag); }
     void slotHandleStretchTimer();
-    void slotHandleMenuTimer();
-    void slotHandleMoveTimer();
+    void slotHandleMenuTimer() { m_touch.reportHold(); }
+    void slotHandleMoveTimer() { m_touch.scrollAtEdge(); }
     void slotChangeScrollBarStyle(int minimum, int maximum);
     void slotHandleItemSizeChange();
     void slotScrollBarShowOrHide(int minimum, int maximum);
     void slotSetScrollBarValue(int value);
     void slotScrollBarSliderPressed();
-    void slotShowPopupItem();
+    void slotShowPopupItem() { m_touch.startDrag(); }
 
 Q_SIGNALS:
     // A tap on an item.
@@ -187,7 +196,6 @@ Q_SIGNALS:
     void widgetItemChangeColor(KSBaseItemWidget* item, QPoint pos, KSScrollViewerWidget* scrollArea);
 
 protected:
-    void timerEvent(QTimerEvent* event) override;
     void mousePressEvent(QMouseEvent* event) override;
     void mouseMoveEvent(QMouseEvent* event) override;
     void mouseReleaseEvent(QMouseEvent* event) override;
@@ -205,7 +213,6 @@ protected:
     TouchTimer m_stretchTimer;
 
 private:
-    // Layout
     void buildBars();
     void adjustLayout();
     void setScrollBarInfo(int maximum, int page);
@@ -217,66 +224,23 @@ private:
     void itemMade(KSBaseItemWidget* item);
     void itemGone(QObject* item);
     void refreshVisible();
-    void changeScrollBarValue(int offset);
     void wheelChange(bool move, int index);
     QPoint toBoard(const QPoint& pos) const;
-    bool isTall() const;
     QList<KSBaseItemWidget*> itemsOf(int first, int count) const;
 
-    // Touch
+    void connectTouch();
     bool handleVScrollBarEvent(QEvent* event);
     void handleScrollBarPressedEvent(QEvent* event);
-    bool handleTouchEventFilter(QObject* object, QEvent* event);
-    void handleFlickBeginEvent(const QPoint& pos);
-    bool isOtherItemTouchWhenGraping(QObject* object, QEvent* event) const;
-    void rest();
-    void breakTouchOf(KSBaseItemWidget* item);
-
-    // Press
-    void beginPress(ScrollViewerPress::Pointer pointer, const QPoint& pos, Qt::MouseButton button);
-    bool isItemDragAreaPressed() const;
-    void handleItemPressedEvent(QMouseEvent* event);
-    void handleAreaPressedEvent(QMouseEvent* event);
-    void startHold(const wchar_t* tag);
-    void JudgeHaveMoveNow(const QPoint& pos);
-    void moveAll(const QPoint& pos);
-    void handleMovement(const QPoint& pos);
-    void endPress(const QPoint& pos);
-    void MouseReleaseSingal(const QPoint& pos);
-    void MouseReleaseChangeColorSingal(const QPoint& pos);
-    std::optional<FlickMotion::DragBounds> dragBounds() const;
-    bool isInsidePressedItem(const QPoint& pos) const;
-
-    // Drag
-    void startDrag();
-    void moveDragItem(const QPoint& pos);
-    void updateIndicator();
-    void dropItem();
-    void handleDropItemWhenRelease();
-    void putItemBack();
-    void abandonDrag();
 
     ScrollViewerBoard* m_board;
-    OneFinger m_finger{this};
+    ScrollViewerTouch m_touch;
     KSScrollBar* m_bar = nullptr;
-    ScrollViewerFlick m_flick;
-    ScrollViewerPress m_press;
-    std::unique_ptr<ScrollViewerDrag> m_drag;
     Qt::Alignment m_barAlignment = Qt::AlignLeft;
-    DragFlagAlignment m_dragAlignment = DRAGFLAG_NONE;
     int m_firstVisible = -1;
     int m_lastVisible = -1;
     int m_savedValue = 0;
-    int m_scrollValue = 0; // what the motion works from
-    int m_effectiveLeft = 0;
-    int m_effectiveWidth = 0;
     int m_spacingToBar = 6;
-    bool m_savedMinitrim = false;
-    bool m_minitrim = true;
-    bool m_itemsCanDrag = false;
-    bool m_barPressed = false;
     bool m_barAutoShow = true;
     bool m_hasSeparator = true;
-    bool m_isTake = false;
     bool m_layingOut = false;
 };

@@ -4,7 +4,6 @@
 
 #include <QMouseEvent>
 #include <QPalette>
-#include <QTouchEvent>
 
 namespace
 {
@@ -24,6 +23,9 @@ KSTabBar::KSTabBar(QWidget* parent) : QTabBar(parent), m_style(new KSTabStyle)
     setStyle(m_style);
     setAttribute(Qt::WA_AcceptTouchEvents);
     setFocusPolicy(Qt::NoFocus);
+    connect(&m_finger, &OneFinger::began, this, [this] { pressAt(fingerPosition()); });
+    connect(&m_finger, &OneFinger::moved, this, [this] { moveTo(fingerPosition()); });
+    connect(&m_finger, &OneFinger::lifted, this, [this] { releaseAt(fingerPosition()); });
     connect(&m_finger, &OneFinger::cancelled, this, &KSTabBar::dropPress);
     setDrawBase(false);
     setExpanding(false);
@@ -116,33 +118,12 @@ void KSTabBar::tabRemoved(int index)
 
 bool KSTabBar::event(QEvent* event)
 {
-    switch (event->type()) {
-    case QEvent::TouchBegin:
-    case QEvent::TouchUpdate:
-    case QEvent::TouchEnd:
-    case QEvent::TouchCancel:
-        return onTouchEvent(static_cast<QTouchEvent*>(event));
-    default:
-        return QTabBar::event(event);
-    }
+    return m_finger.takes(event) || QTabBar::event(event);
 }
 
-bool KSTabBar::onTouchEvent(QTouchEvent* event)
+QPoint KSTabBar::fingerPosition() const
 {
-    switch (m_finger.follow(event)) {
-    case OneFinger::Step::Begin:
-        pressAt(m_finger.positionIn(this).toPoint());
-        break;
-    case OneFinger::Step::Move:
-        moveTo(m_finger.positionIn(this).toPoint());
-        break;
-    case OneFinger::Step::End:
-        releaseAt(m_finger.positionIn(this).toPoint());
-        break;
-    case OneFinger::Step::None:
-        break;
-    }
-    return true;
+    return m_finger.positionIn(this).toPoint();
 }
 
 void KSTabBar::mousePressEvent(QMouseEvent* event)

@@ -7,7 +7,6 @@
 #include <QTabBar>
 
 class KSTabStyle;
-class QTouchEvent;
 
 // A tab bar for one finger: tabs have the size they are told and change on the lift, so that a finger that
 // slides off changes nothing.
@@ -41,7 +40,7 @@ protected:
     void hideEvent(QHideEvent* event) override;
 
 private:
-    bool onTouchEvent(QTouchEvent* event);
+    QPoint fingerPosition() const;
     void pressAt(const QPoint& position);
     void moveTo(const QPoint& position);
     void releaseAt(const QPoint& position);

@@ -10,24 +10,6 @@
 #include <QStyleOptionHeader>
 #include <QTouchEvent>
 
-namespace
-{
-
-bool isTouch(const QEvent* event)
-{
-    switch (event->type()) {
-    case QEvent::TouchBegin:
-    case QEvent::TouchUpdate:
-    case QEvent::TouchEnd:
-    case QEvent::TouchCancel:
-        return true;
-    default:
-        return false;
-    }
-}
-
-} // namespace
-
 KSTreeHeaderView::KSTreeHeaderView(KSTreeView* view) : QHeaderView(Qt::Horizontal, view), m_view(view)
 {
     setAttribute(Qt::WA_AcceptTouchEvents);
@@ -40,6 +22,8 @@ KSTreeHeaderView::KSTreeHeaderView(KSTreeView* view) : QHeaderView(Qt::Horizonta
     setSortIndicatorShown(true);
     setSortIndicator(-1, Qt::AscendingOrder);
     setFocusPolicy(Qt::NoFocus);
+    connect(&m_finger, &OneFinger::acted, this,
+            [this](QEvent::Type type) { sendMouse(type, m_finger.position()); });
     // Far outside: the section comes up unclicked.
     connect(&m_finger, &OneFinger::cancelled, this, [this] {
         sendMouse(QEvent::MouseButtonRelease, viewport()->mapToGlobal(QPointF(-10000, -10000)));
@@ -54,48 +38,34 @@ QSize KSTreeHeaderView::sizeHint() const
 
 bool KSTreeHeaderView::event(QEvent* event)
 {
-    if (isTouch(event)) {
-        return onTouchEvent(static_cast<QTouchEvent*>(event));
-    }
-    return event->type() == QEvent::Gesture || QHeaderView::event(event);
+    return takes(event) || QHeaderView::event(event);
 }
 
 bool KSTreeHeaderView::viewportEvent(QEvent* event)
 {
-    if (isTouch(event)) {
-        return onTouchEvent(static_cast<QTouchEvent*>(event));
-    }
-    return event->type() == QEvent::Gesture || QHeaderView::viewportEvent(event);
+    return takes(event) || QHeaderView::viewportEvent(event);
+}
+
+bool KSTreeHeaderView::takes(QEvent* event)
+{
+    return event->type() == QEvent::Gesture ||
+           (OneFinger::isTouch(event) && onTouchEvent(static_cast<QTouchEvent*>(event)));
 }
 
 bool KSTreeHeaderView::onTouchEvent(QTouchEvent* event)
 {
     event->accept();
-    switch (m_finger.follow(event)) {
-    case OneFinger::Step::Begin:
-        sendMouse(QEvent::MouseButtonPress, m_finger.position());
-        break;
-    case OneFinger::Step::Move:
-        sendMouse(QEvent::MouseMove, m_finger.position());
-        break;
-    case OneFinger::Step::End:
-        sendMouse(QEvent::MouseButtonRelease, m_finger.position());
-        break;
-    case OneFinger::Step::None:
-        break;
-    }
+    m_finger.follow(event);
     return true;
 }
 
 void KSTreeHeaderView::sendMouse(QEvent::Type type, const QPointF& globalPosition)
 {
-    const bool release = type == QEvent::MouseButtonRelease;
-    const Qt::MouseButton button = type == QEvent::MouseMove ? Qt::NoButton : Qt::LeftButton;
-    QMouseEvent mouse(type, viewport()->mapFromGlobal(globalPosition), globalPosition, button,
-                      release ? Qt::NoButton : Qt::LeftButton, Qt::NoModifier);
+    QMouseEvent mouse =
+        OneFinger::mouseEvent(type, viewport()->mapFromGlobal(globalPosition), globalPosition);
     if (type == QEvent::MouseButtonPress) {
         mousePressEvent(&mouse);
-    } else if (release) {
+    } else if (type == QEvent::MouseButtonRelease) {
         mouseReleaseEvent(&mouse);
     } else {
         mouseMoveEvent(&mouse);

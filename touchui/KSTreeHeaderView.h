@@ -25,6 +25,7 @@ protected:
     QSize sizeHint() const override;
 
 private:
+    bool takes(QEvent* event);
     void sendMouse(QEvent::Type type, const QPointF& globalPosition);
 
     KSTreeView* m_view;

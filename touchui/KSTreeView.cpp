@@ -4,16 +4,18 @@
 #include "touchui/KSScrollBar.h"
 #include "touchui/KSTreeHeaderView.h"
 #include "touchui/KSTreeModel.h"
+#include "touchui/TreeCheckStates.h"
 
+#include <QApplication>
 #include <QFontMetrics>
 #include <QKeyEvent>
+#include <QMouseEvent>
 #include <QPainter>
+#include <QScrollBar>
+#include <QTouchEvent>
 
 namespace
 {
-
-constexpr int LOADING_INTERVAL = 100;
-constexpr int TOOLTIP_TIME = 3000;
 
 // As wide as a finger, and without arrows.
 const char SCROLL_BAR_STYLE[] =
@@ -23,6 +25,18 @@ const char SCROLL_BAR_STYLE[] =
     "QScrollBar::handle:vertical { min-height: 42px } QScrollBar::handle:horizontal { min-width: 42px }";
 
 } // namespace
+
+QStringList KSTreeView::s_checkBoxImagesPath = {
+    QStringLiteral(":/CheckBox/Checkbox_On_Rest"),
+    QStringLiteral(":/CheckBox/Checkbox_On_Pressed"),
+    QStringLiteral(":/CheckBox/Checkbox_On_Disabled"),
+    QStringLiteral(":/CheckBox/Checkbox_Off_Rest"),
+    QStringLiteral(":/CheckBox/Checkbox_Off_Pressed"),
+    QStringLiteral(":/CheckBox/Checkbox_Off_Disabled"),
+    QStringLiteral(":/CheckBox/Checkbox_Partial_Rest"),
+    QStringLiteral(":/CheckBox/Checkbox_Partial_Pressed"),
+    QStringLiteral(":/CheckBox/Checkbox_Partial_Disabled"),
+};
 
 KSTreeView::KSTreeView(QWidget* parent)
     : QTreeView(parent)
@@ -46,18 +60,15 @@ KSTreeView::KSTreeView(QWidget* parent)
     setTextElideMode(Qt::ElideRight);
     connect(&m_finger, &OneFinger::held, this, &KSTreeView::slotHold);
     connect(&m_finger, &OneFinger::cancelled, this, &KSTreeView::rest);
-    m_singleShotTimer.setSingleShot(true);
-    m_singleShotTimer.setInterval(TOOLTIP_TIME);
-    connect(&m_singleShotTimer, &QTimer::timeout, this, &KSTreeView::hideElidedText);
-    m_loadingTimer.setInterval(LOADING_INTERVAL);
-    connect(&m_loadingTimer, &QTimer::timeout, this, &KSTreeView::slotUpdateLoadingIcon);
+    connect(&m_flicker, &Flicker::started, this, &KSTreeView::motionStarted);
+    connect(&m_flicker, &Flicker::ticked, this, [this] { changeScrollBarValue(getDistance().y()); });
+    connect(&m_flicker, &Flicker::ended, this, &KSTreeView::showLastRowWhole);
     connect(this, &KSTreeView::editorEvent, this,
             static_cast<void (QAbstractItemView::*)(const QModelIndex&)>(&QAbstractItemView::edit));
 }
 
 KSTreeView::~KSTreeView()
 {
-    KSTreeView::stopFlick();
     setStyle(nullptr); // ours goes before the widget does
 }
 
@@ -76,6 +87,7 @@ void KSTreeView::setModel(QAbstractItemModel* model)
     cancelPress();
     stopFlick();
     m_treeModel = qobject_cast<KSTreeModel*>(model);
+    m_loadingMarks.setModel(m_treeModel);
     QTreeView::setModel(model);
 }
 
@@ -380,4 +392,389 @@ void KSTreeView::keyPressEvent(QKeyEvent* event)
     default:
         QTreeView::keyPressEvent(event);
     }
+}
+
+// --- Check boxes --------------------------------------------------------------------------------------
+
+KSTreeView::CheckBoxImage KSTreeView::getCheckBoxImageType(const QModelIndex& index) const
+{
+    int family = OffRest;
+    switch (index.data(Qt::CheckStateRole).toInt()) {
+    case Qt::Checked:
+        family = OnRest;
+        break;
+    case Qt::PartiallyChecked:
+        family = PartialRest;
+        break;
+    default:
+        break;
+    }
+    int state = 0;
+    if (!isUsable(index)) {
+        state = OnDisabled;
+    } else if (m_pressedCheckBox.isValid() && m_pressedCheckBox == index.siblingAtColumn(0)) {
+        state = OnPressed;
+    }
+    return static_cast<CheckBoxImage>(family + state);
+}
+
+void KSTreeView::changeCheckState(const QModelIndex& index)
+{
+    const QModelIndex first = index.siblingAtColumn(0);
+    if (m_treeModel != nullptr && isUsable(first) && m_treeModel->getCheckable(first)) {
+        TreeCheckStates(*m_treeModel).toggle(first);
+    }
+}
+
+void KSTreeView::changeChildrenCheckState(const QModelIndex& index, Qt::CheckState state)
+{
+    if (m_treeModel != nullptr) {
+        TreeCheckStates(*m_treeModel).setChildren(index, state);
+    }
+}
+
+void KSTreeView::changeParentsCheckState(const QModelIndex& index)
+{
+    if (m_treeModel != nullptr) {
+        TreeCheckStates(*m_treeModel).updateParents(index);
+    }
+}
+
+void KSTreeView::changeCheckStateByNumber(const QModelIndex& index, int number)
+{
+    if (m_treeModel != nullptr) {
+        TreeCheckStates(*m_treeModel).setByNumber(index, number);
+    }
+}
+
+void KSTreeView::setCheckBoxVisible(bool visible)
+{
+    m_checkBoxVisible = visible;
+    m_pressedCheckBox = QModelIndex();
+    viewport()->update();
+}
+
+// --- Loading and recording ----------------------------------------------------------------------------
+
+QString KSTreeView::getLoadingImagePath(int step) const
+{
+    return TreeLoadingMarks::imagePath(step);
+}
+
+void KSTreeView::dataChanged(const QModelIndex& topLeft, const QModelIndex& bottomRight,
+                             const QList<int>& roles)
+{
+    QTreeView::dataChanged(topLeft, bottomRight, roles);
+    if (roles.contains(KSVIEW::ItemLoadingRole) && topLeft.data(KSVIEW::ItemLoadingRole).toInt() > 0) {
+        m_loadingMarks.start();
+    }
+}
+
+void KSTreeView::slotUpdateLoadingIcon()
+{
+    m_loadingMarks.turn();
+}
+
+void KSTreeView::clearAllLoadingState()
+{
+    m_loadingMarks.stop();
+    if (m_treeModel != nullptr) {
+        m_treeModel->setAttributeOfAll(KSVIEW::ItemLoadingRole, 0);
+    }
+}
+
+void KSTreeView::clearRecording()
+{
+    if (m_treeModel != nullptr) {
+        m_treeModel->setAttributeOfAll(KSVIEW::ItemRecordingRole, false);
+    }
+}
+
+void KSTreeView::showElidedText(const QModelIndex& index)
+{
+    const QRect row = getIndexVisualRect(index);
+    const QRect cell = visualRect(index);
+    const QRect text =
+        index.column() == 0 ? getLayoutForFirstColumn(cell, index).text : m_viewStyle->textRect(cell);
+    m_elidedText.show(QRect(viewport()->mapToGlobal(row.topLeft()), row.size()),
+                      index.data(Qt::DisplayRole).toString(), text.width());
+}
+
+// --- Touch --------------------------------------------------------------------------------------------
+
+bool KSTreeView::event(QEvent* event)
+{
+    if (OneFinger::isTouch(event)) {
+        return onTouchEvent(static_cast<QTouchEvent*>(event));
+    }
+    return event->type() == QEvent::Gesture || QTreeView::event(event);
+}
+
+bool KSTreeView::viewportEvent(QEvent* event)
+{
+    if (OneFinger::isTouch(event)) {
+        return onTouchEvent(static_cast<QTouchEvent*>(event));
+    }
+    return event->type() == QEvent::Gesture || QTreeView::viewportEvent(event);
+}
+
+bool KSTreeView::onTouchEvent(QTouchEvent* event)
+{
+    event->accept();
+    switch (m_finger.follow(event)) {
+    case OneFinger::Step::Begin:
+        return onTouchBeginEvent(event);
+    case OneFinger::Step::Move:
+        return onTouchUpdateEvent(event);
+    case OneFinger::Step::End:
+        return onTouchEndEvent(event);
+    case OneFinger::Step::None:
+        return true;
+    }
+    return true;
+}
+
+QPoint KSTreeView::fingerPosition() const
+{
+    return m_finger.positionIn(viewport()).toPoint();
+}
+
+bool KSTreeView::onTouchBeginEvent(QTouchEvent*)
+{
+    const QPoint point = fingerPosition();
+    const bool brake = isAutoFilck();
+    m_flicker.begin(point);
+    if (!brake) {
+        sendMouse(QEvent::MouseButtonPress, point);
+    }
+    return true;
+}
+
+bool KSTreeView::onTouchUpdateEvent(QTouchEvent*)
+{
+    const QPoint point = fingerPosition();
+    m_flicker.follow(point);
+    sendMouse(QEvent::MouseMove, point);
+    return true;
+}
+
+bool KSTreeView::onTouchEndEvent(QTouchEvent* event)
+{
+    m_flicker.lift(fingerPosition());
+    onTranslateTouchEndEventToMouse(event);
+    return true;
+}
+
+void KSTreeView::onTranslateTouchEndEventToMouse(QTouchEvent*)
+{
+    sendMouse(QEvent::MouseButtonRelease, fingerPosition());
+}
+
+// Nothing was tapped, and nothing goes on moving.
+void KSTreeView::rest()
+{
+    m_flicker.cancel();
+    cancelPress();
+    m_elidedText.hide();
+}
+
+void KSTreeView::sendMouse(QEvent::Type type, const QPoint& point)
+{
+    QMouseEvent mouse = OneFinger::mouseEvent(type, point, viewport()->mapToGlobal(point));
+    m_sendingMouse = true;
+    if (type == QEvent::MouseButtonPress) {
+        mousePressEvent(&mouse);
+    } else if (type == QEvent::MouseButtonRelease) {
+        mouseReleaseEvent(&mouse);
+    } else {
+        mouseMoveEvent(&mouse);
+    }
+    m_sendingMouse = false;
+}
+
+// --- Mouse, and what a touch is passed on as ----------------------------------------------------------
+
+void KSTreeView::mousePressEvent(QMouseEvent* event)
+{
+    event->accept();
+    const QPoint point = event->position().toPoint();
+    if (event->button() != Qt::LeftButton || (!m_sendingMouse && m_finger.isDown())) {
+        return;
+    }
+    if (!m_sendingMouse) {
+        const bool brake = isAutoFilck();
+        m_flicker.begin(point);
+        if (brake) {
+            return;
+        }
+    }
+    beginPress(point);
+}
+
+void KSTreeView::mouseMoveEvent(QMouseEvent* event)
+{
+    event->accept();
+    const QPoint point = event->position().toPoint();
+    if (!m_sendingMouse && (event->buttons() & Qt::LeftButton) && !m_finger.isDown()) {
+        m_flicker.follow(point);
+    }
+    if (m_pressState == NotPressed) {
+        return;
+    }
+    if ((point - m_pressPoint).manhattanLength() > QApplication::startDragDistance()) {
+        m_finger.stopHold();
+        m_moved = true;
+    }
+    if (m_pressedCheckBox.isValid() && !getCheckBoxRectForTouch(m_pressedCheckBox).contains(point)) {
+        m_pressedCheckBox = QModelIndex();
+        viewport()->update();
+    }
+    if (m_pressedIndicator.isValid() && !indicatorRectForTouch(m_pressedIndicator).contains(point)) {
+        m_pressedIndicator = QModelIndex();
+        viewport()->update();
+    }
+}
+
+void KSTreeView::mouseReleaseEvent(QMouseEvent* event)
+{
+    event->accept();
+    const QPoint point = event->position().toPoint();
+    if (event->button() != Qt::LeftButton || (!m_sendingMouse && m_finger.isDown())) {
+        return;
+    }
+    if (!m_sendingMouse) {
+        m_flicker.lift(point);
+    }
+    const bool isTap = m_pressState == Pressed && !m_moved &&
+                       (point - m_pressPoint).manhattanLength() <= QApplication::startDragDistance();
+    if (isTap) {
+        tap(point);
+    }
+    cancelPress();
+}
+
+void KSTreeView::mouseDoubleClickEvent(QMouseEvent* event)
+{
+    mousePressEvent(event);
+}
+
+void KSTreeView::beginPress(const QPoint& point)
+{
+    cancelPress();
+    m_pressState = Pressed;
+    m_pressPoint = point;
+    const QModelIndex index = indexAt(point);
+    m_pressIndex = index;
+    if (!isUsable(index)) {
+        return;
+    }
+    const QModelIndex first = index.siblingAtColumn(0);
+    if (getCheckBoxRectForTouch(first).contains(point)) {
+        m_pressedCheckBox = first;
+    } else if (indicatorRectForTouch(first).contains(point)) {
+        m_pressedIndicator = first;
+    } else {
+        m_finger.startHold(m_holdInterval);
+    }
+    viewport()->update();
+}
+
+void KSTreeView::cancelPress()
+{
+    m_finger.stopHold();
+    m_pressState = NotPressed;
+    m_moved = false;
+    m_pressIndex = QModelIndex();
+    m_pressedCheckBox = QModelIndex();
+    m_pressedIndicator = QModelIndex();
+    viewport()->update();
+}
+
+// What was pressed counts, also when the list has moved a few pixels under the finger. Receivers may change
+// the model.
+void KSTreeView::tap(const QPoint& point)
+{
+    const QPersistentModelIndex index = m_pressIndex;
+    if (m_pressedCheckBox.isValid()) {
+        if (getCheckBoxRectForTouch(m_pressedCheckBox).contains(point)) {
+            changeCheckState(m_pressedCheckBox);
+        }
+    } else if (m_pressedIndicator.isValid()) {
+        if (indicatorRectForTouch(m_pressedIndicator).contains(point)) {
+            setExpanded(m_pressedIndicator, !isExpanded(m_pressedIndicator));
+        }
+    } else if (isUsable(index)) {
+        makeCurrent(index);
+        if (index.isValid()) {
+            Q_EMIT signalCurrentChangedByTouch(index);
+        }
+        if (index.isValid()) {
+            Q_EMIT clicked(index);
+        }
+    }
+}
+
+void KSTreeView::makeCurrent(const QModelIndex& index)
+{
+    const QPersistentModelIndex kept = index;
+    setCurrentIndex(index);
+    if (kept.isValid()) {
+        Q_EMIT pressed(kept);
+    }
+}
+
+void KSTreeView::slotHold()
+{
+    if (m_pressState != Pressed || !isUsable(m_pressIndex)) {
+        return;
+    }
+    m_pressState = Held;
+    const QPersistentModelIndex index = m_pressIndex;
+    makeCurrent(index);
+    if (index.isValid() && isTextElide(index)) {
+        showElidedText(index);
+    }
+    if (index.isValid()) {
+        Q_EMIT signalPressedAndHold(index);
+    }
+}
+
+// --- Motion -------------------------------------------------------------------------------------------
+
+void KSTreeView::motionStarted()
+{
+    setVerticalScrollMode(QAbstractItemView::ScrollPerPixel);
+    m_finger.stopHold();
+    m_elidedText.hide();
+}
+
+void KSTreeView::showLastRowWhole()
+{
+    if (verticalScrollBar()->value() == verticalScrollBar()->maximum()) {
+        scrollToBottom();
+    }
+}
+
+QPoint KSTreeView::getDistance()
+{
+    return isAutoFilck() ? getFlickDistance() : getDragDistance();
+}
+
+void KSTreeView::changeScrollBarValue(int offset)
+{
+    QScrollBar* bar = verticalScrollBar();
+    bar->setValue(FlickMotion::scrolledValue(bar->value(), offset, bar->minimum(), bar->maximum()));
+}
+
+void KSTreeView::hideEvent(QHideEvent* event)
+{
+    rest();
+    QTreeView::hideEvent(event);
+}
+
+void KSTreeView::allTimersReset()
+{
+    m_finger.restartHold();
+    m_elidedText.restartIfActive();
+    m_loadingMarks.restartIfActive();
 }

@@ -1,15 +1,16 @@
 #pragma once
 
-#include "touchui/FlickMotion.h"
+#include "touchui/ElidedTextTip.h"
+#include "touchui/Flicker.h"
 #include "touchui/KSVIEW.h"
 #include "touchui/KSViewStyle.h"
 #include "touchui/OneFinger.h"
+#include "touchui/TreeLoadingMarks.h"
 
 #include <QEvent>
 #include <QMap>
 #include <QPersistentModelIndex>
 #include <QStringList>
-#include <QTimer>
 #include <QTreeView>
 #include <memory>
 
@@ -70,7 +71,7 @@ public:
     // Toggles a checkable and enabled cell, with all below and above it.
     virtual void changeCheckState(const QModelIndex& index);
     virtual void changeParentsCheckState(const QModelIndex& index);
-    // Sets a row's state by how many of its children are on or partial: none, all and each of them on, else.
+    // See TreeCheckStates.
     virtual void changeCheckStateByNumber(const QModelIndex& index, int number);
     virtual void changeChildrenCheckState(const QModelIndex& index, Qt::CheckState state);
     // Moves the current row right behind a row of the same parent; false when that cannot be.
@@ -94,17 +95,17 @@ public:
     virtual bool onTouchEndEvent(QTouchEvent* event);
     virtual void onTranslateTouchEndEventToMouse(QTouchEvent* event);
 
-    virtual void setAutoFlick(bool autoFlick);
-    virtual void setStartPoint(const QPoint& point);
-    virtual void setEndPoint(const QPoint& point);
-    virtual bool isFlickEnd();
-    virtual bool hasFlicked();
-    virtual void stopFlick();
-    virtual bool isAutoFilck();
+    virtual void setAutoFlick(bool autoFlick) { m_flicker.setGliding(autoFlick); }
+    virtual void setStartPoint(const QPoint& point) { m_flicker.setStart(point); }
+    virtual void setEndPoint(const QPoint& point) { m_flicker.setEnd(point); }
+    virtual bool isFlickEnd() { return m_flicker.isEnd(); }
+    virtual bool hasFlicked() { return m_flicker.hasFlicked(); }
+    virtual void stopFlick() { m_flicker.stop(); }
+    virtual bool isAutoFilck() { return m_flicker.isGliding(); }
     // By how much the content moves at this tick; moves the start point.
     virtual QPoint getDistance();
-    virtual QPoint getFlickDistance();
-    virtual QPoint getDragDistance();
+    virtual QPoint getFlickDistance() { return FlickMotion::pixels(m_flicker.glide()); }
+    virtual QPoint getDragDistance() { return FlickMotion::pixels(m_flicker.drag()); }
     // Scrolls the content down by the offset, within the range.
     virtual void changeScrollBarValue(int offset);
     // The target of a finger around a check box.
@@ -139,7 +140,6 @@ public Q_SLOTS:
 protected:
     bool event(QEvent* event) override;
     bool viewportEvent(QEvent* event) override;
-    void timerEvent(QTimerEvent* event) override;
     void mousePressEvent(QMouseEvent* event) override;
     void mouseMoveEvent(QMouseEvent* event) override;
     void mouseReleaseEvent(QMouseEvent* event) override;
@@ -166,9 +166,8 @@ private:
     static constexpr int HOLD_INTERVAL = 700; // ms
 
     void initScrollBars();
-    void beginMotion(const QPoint& point);
-    void moveMotion(const QPoint& point);
-    void endMotion(const QPoint& point);
+    void motionStarted();
+    void showLastRowWhole();
     void cancelPress();
     void rest();
     QPoint fingerPosition() const;
@@ -180,24 +179,15 @@ private:
     QRect firstCellRect(const QModelIndex& index) const;
     bool isUsable(const QModelIndex& index) const;
     void showElidedText(const QModelIndex& index);
-    void hideElidedText();
 
     std::unique_ptr<KSViewStyle> m_viewStyle;
     CustomTreeDelegete* m_delegate;
     KSTreeModel* m_treeModel = nullptr;
     QMap<KSVIEW::enumDesignAttributeRole, QVariant> m_designAttributes;
 
-    const FlickMotion::Rules m_rules = FlickMotion::treeView();
-    QPoint m_startPoint;
-    QPoint m_endPoint;
-    int m_flickTimerId = 0;
-    int m_startScrollValue = 0;
-    int m_scrollingFlag = 0; // 1 while the motion scrolls
-    bool m_autoFlick = false;
-    bool m_hasFlicked = false;
-    bool m_pendingStart = false; // the first movement sets the start point anew
     OneFinger m_finger{this};
-    bool m_sendingMouse = false; // a touch is being passed on as a mouse event
+    Flicker m_flicker{this, FlickMotion::treeView()}; // in viewport coordinates
+    bool m_sendingMouse = false;                      // a touch is being passed on as a mouse event
 
     PressState m_pressState = NotPressed;
     QPoint m_pressPoint;
@@ -207,9 +197,8 @@ private:
     QPersistentModelIndex m_pressedIndicator;
     QPersistentModelIndex m_renameIndex;
     bool m_checkBoxVisible = true;
-    bool m_elidedTextShown = false;
 
     int m_holdInterval = HOLD_INTERVAL;
-    QTimer m_singleShotTimer; // takes the balloon of a shortened name away
-    QTimer m_loadingTimer;
+    ElidedTextTip m_elidedText;
+    TreeLoadingMarks m_loadingMarks;
 };

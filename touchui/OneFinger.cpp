@@ -22,8 +22,63 @@ OneFinger::Step OneFinger::follow(const QTouchEvent* event, QObject* receiver)
     if (receiver == nullptr) {
         receiver = event->target() != nullptr ? event->target() : m_widget;
     }
-    m_step = stepOf(event, receiver);
-    return m_step;
+    const Step step = stepOf(event, receiver);
+    m_step = step;
+    report(step);
+    return step;
+}
+
+// A receiver may destroy the widget, and with it this object.
+void OneFinger::report(Step step)
+{
+    const QPointer<OneFinger> self = this;
+    switch (step) {
+    case Step::Begin:
+        Q_EMIT began();
+        break;
+    case Step::Move:
+        Q_EMIT moved();
+        break;
+    case Step::End:
+        Q_EMIT lifted();
+        break;
+    case Step::None:
+        return;
+    }
+    if (self != nullptr) {
+        Q_EMIT acted(step == Step::Begin  ? QEvent::MouseButtonPress
+                     : step == Step::Move ? QEvent::MouseMove
+                                          : QEvent::MouseButtonRelease);
+    }
+}
+
+bool OneFinger::takes(QEvent* event, QObject* receiver)
+{
+    if (!isTouch(event)) {
+        return false;
+    }
+    follow(static_cast<QTouchEvent*>(event), receiver);
+    return true;
+}
+
+bool OneFinger::isTouch(const QEvent* event)
+{
+    switch (event->type()) {
+    case QEvent::TouchBegin:
+    case QEvent::TouchUpdate:
+    case QEvent::TouchEnd:
+    case QEvent::TouchCancel:
+        return true;
+    default:
+        return false;
+    }
+}
+
+QMouseEvent OneFinger::mouseEvent(QEvent::Type type, const QPointF& position, const QPointF& globalPosition)
+{
+    return QMouseEvent(type, position, globalPosition,
+                       type == QEvent::MouseMove ? Qt::NoButton : Qt::LeftButton,
+                       type == QEvent::MouseButtonRelease ? Qt::NoButton : Qt::LeftButton, Qt::NoModifier);
 }
 
 OneFinger::Step OneFinger::stepOf(const QTouchEvent* event, QObject* receiver)

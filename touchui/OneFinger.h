@@ -2,6 +2,8 @@
 
 #include "touchui/TouchTimer.h"
 
+#include <QEvent>
+#include <QMouseEvent>
 #include <QObject>
 #include <QPointF>
 #include <QPointer>
@@ -32,6 +34,9 @@ public:
     // Takes a touch event. receiver is the object that the event was sent to, where the event does not say it
     // itself: the widget, or a child whose touches the widget takes.
     Step follow(const QTouchEvent* event, QObject* receiver = nullptr);
+    // Takes an event that is of touch, see follow(). Returns whether it is.
+    bool takes(QEvent* event, QObject* receiver = nullptr);
+    static bool isTouch(const QEvent* event);
     // What the last event meant.
     Step step() const { return m_step; }
     // Cancels the touch at its receiver, whose part of the touch lock becomes free, and the hold. Does
@@ -62,7 +67,17 @@ public:
 
     bool eventFilter(QObject* object, QEvent* event) override;
 
+    // The mouse event that a touch is passed on as: the finger is the left button. position is in the
+    // widget.
+    static QMouseEvent mouseEvent(QEvent::Type type, const QPointF& position, const QPointF& globalPosition);
+
 Q_SIGNALS:
+    // The finger came down, moved, was lifted; by then isDown() is false.
+    void began();
+    void moved();
+    void lifted();
+    // The same, as the type of the mouse event that says so.
+    void acted(QEvent::Type mouse);
     // The touch ended without a lift; isDown() is false already. When the object that received the touch is
     // destroyed, this comes once it is gone.
     void cancelled();
@@ -71,6 +86,7 @@ Q_SIGNALS:
 private:
     static constexpr int NONE = -1;
 
+    void report(Step step);
     Step stepOf(const QTouchEvent* event, QObject* receiver);
     Step begin(const QTouchEvent* event, QObject* receiver);
     bool isLost(const QObject* receiver) const;

@@ -33,6 +33,7 @@ ScrollViewerBoard::ScrollViewerBoard(QObject* parent)
     , m_panel(new QWidget)
     , m_board(new QWidget(m_panel))
     , m_placeholder(new QLabel(m_board))
+    , m_separator(QStringLiteral(":/Pane_Tab/Separator_H"))
     , m_spacing(SPACING)
 {
     m_panel->setObjectName(QStringLiteral("panelBoard"));
@@ -285,14 +286,11 @@ KSBaseItemWidget* ScrollViewerBoard::itemAroundThePos(const QPoint& pos, const Q
 
 void ScrollViewerBoard::paintSeparators(QPainter& painter, const QRect& exposed) const
 {
-    if (isEmpty())
-        return;
-    const QPixmap separator(QStringLiteral(":/Pane_Tab/Separator_H"));
-    if (separator.isNull())
+    if (isEmpty() || m_separator.isNull())
         return;
     const QRect first = m_rows.front().place;
     for (auto row = firstEndingAt(exposed.top() - SEPARATOR_HEIGHT);
          row != m_rows.end() && row + 1 != m_rows.end() && row->place.bottom() < exposed.bottom(); ++row)
         painter.drawPixmap(QRect(first.x(), row->place.bottom() + 1, first.width(), SEPARATOR_HEIGHT),
-                           separator);
+                           m_separator);
 }

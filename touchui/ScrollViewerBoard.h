@@ -5,6 +5,7 @@
 #include <QList>
 #include <QMargins>
 #include <QObject>
+#include <QPixmap>
 #include <QPoint>
 #include <QRect>
 #include <QSize>
@@ -108,6 +109,7 @@ private:
     QWidget* m_panel;
     QWidget* m_board;
     QLabel* m_placeholder;
+    QPixmap m_separator;
     std::vector<Row> m_rows;
     QMargins m_margins;
     int m_spacing;

@@ -1,7 +1,7 @@
 // A clock for the timers of touch widgets that goes on only when it is told to.
 #pragma once
 
-#include "touchui/TouchClock.h"
+#include "touchui/TouchTimer.h"
 
 #include <QCoreApplication>
 #include <QMap>
@@ -9,11 +9,11 @@
 #include <QPointer>
 #include <QTimerEvent>
 
-class ManualClock : public TouchClock
+class ManualClock : public TouchTimer::Clock
 {
 public:
-    ManualClock() { setInstance(this); }
-    ~ManualClock() override { setInstance(nullptr); }
+    ManualClock() { TouchTimer::setClock(this); }
+    ~ManualClock() override { TouchTimer::setClock(nullptr); }
 
     int start(QObject* receiver, int milliseconds) override
     {

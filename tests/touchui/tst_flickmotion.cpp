@@ -21,7 +21,7 @@ Rules rulesOf(int kind)
     case Grid:
         return templateGrid();
     case Fonts:
-        return fontList();
+        return comboList();
     default:
         return scrollViewer();
     }

@@ -100,7 +100,8 @@ void TestInputContext::describesTheRestOfALineEdit()
 void TestInputContext::describesATextItem()
 {
     m_item->setObjectName(QStringLiteral("0#Text Input#1#300#a#b#4#2#4#1##299"));
-    tagSoftKeyBoardInitData data = m_context->getSendData(m_item);
+    m_context->setFocusWidget(m_view);
+    tagSoftKeyBoardInitData data = m_context->getSendData();
     QCOMPARE(data.fieldKind, 0);
     QCOMPARE(data.title, std::wstring(L"Text Input"));
     QCOMPARE(data.keyboardType, 1);
@@ -113,7 +114,7 @@ void TestInputContext::describesATextItem()
     QCOMPARE(data.limitCondition, std::wstring());
     QCOMPARE(data.lastValue, 299);
     m_item->setObjectName(QStringLiteral("0#Text Input#0#300##-1#-1#-1#2##300"));
-    data = m_context->getSendData(m_item);
+    data = m_context->getSendData();
     QCOMPARE(data.text, std::wstring());
     QCOMPARE(data.textLength, -1);
     QCOMPARE(data.selectionStart, -1);

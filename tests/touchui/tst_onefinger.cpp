@@ -195,6 +195,66 @@ private Q_SLOTS:
         QCOMPARE(mCancelled->count(), 1);
     }
 
+    void whatTheFingerDoesIsReported()
+    {
+        QList<QEvent::Type> acted;
+        connect(&mPad->finger, &OneFinger::acted, this, [&](QEvent::Type type) { acted.append(type); });
+        QSignalSpy began(&mPad->finger, &OneFinger::began);
+        QSignalSpy moved(&mPad->finger, &OneFinger::moved);
+        QSignalSpy lifted(&mPad->finger, &OneFinger::lifted);
+        mTouch->press(mPad.get(), QPoint(20, 30));
+        mTouch->move(mPad.get(), QPoint(25, 30));
+        mTouch->lift(mPad.get(), QPoint(25, 30));
+        QCOMPARE(acted, (QList<QEvent::Type>{QEvent::MouseButtonPress, QEvent::MouseMove,
+                                             QEvent::MouseButtonRelease}));
+        QCOMPARE(began.count(), 1);
+        QCOMPARE(moved.count(), 1);
+        QCOMPARE(lifted.count(), 1);
+        mTouch->press(mPad.get(), QPoint(20, 30));
+        mPad->finger.cancel();
+        QCOMPARE(lifted.count(), 1);
+        QCOMPARE(acted.size(), 4);
+    }
+
+    void aReceiverMayDestroyTheWidget()
+    {
+        connect(&mPad->finger, &OneFinger::lifted, this, [this] { mPad.reset(); });
+        QTouchEvent begin(QEvent::TouchBegin, mTouch->device(), Qt::NoModifier,
+                          {QEventPoint(1, QEventPoint::Pressed, QPointF(40, 30), QPointF(40, 30))});
+        QVERIFY(mPad->finger.takes(&begin));
+        QTouchEvent end(QEvent::TouchEnd, mTouch->device(), Qt::NoModifier,
+                        {QEventPoint(1, QEventPoint::Released, QPointF(40, 30), QPointF(40, 30))});
+        QVERIFY(mPad->finger.takes(&end));
+        QVERIFY(mPad == nullptr);
+    }
+
+    void otherEventsAreNotTaken()
+    {
+        QEvent event(QEvent::MouseMove);
+        QVERIFY(!mPad->finger.takes(&event));
+    }
+
+    void aFingerIsTheLeftButton_data()
+    {
+        QTest::addColumn<int>("type");
+        QTest::addColumn<int>("button");
+        QTest::addColumn<int>("buttons");
+        QTest::newRow("press") << int(QEvent::MouseButtonPress) << int(Qt::LeftButton) << int(Qt::LeftButton);
+        QTest::newRow("move") << int(QEvent::MouseMove) << int(Qt::NoButton) << int(Qt::LeftButton);
+        QTest::newRow("lift") << int(QEvent::MouseButtonRelease) << int(Qt::LeftButton) << int(Qt::NoButton);
+    }
+
+    void aFingerIsTheLeftButton()
+    {
+        QFETCH(int, type);
+        const QMouseEvent event = OneFinger::mouseEvent(QEvent::Type(type), QPointF(3, 4), QPointF(103, 204));
+        QCOMPARE(int(event.type()), type);
+        QTEST(int(event.button()), "button");
+        QTEST(int(event.buttons().toInt()), "buttons");
+        QCOMPARE(event.position(), QPointF(3, 4));
+        QCOMPARE(event.globalPosition(), QPointF(103, 204));
+    }
+
     void aDisabledWidgetHasNoFinger()
     {
         mPad->setEnabled(false);

@@ -121,7 +121,7 @@ void TestScrollViewer::hold()
 
 void TestScrollViewer::holdInRealTime()
 {
-    TouchClock::setInstance(nullptr);
+    TouchTimer::setClock(nullptr);
     m->fill(20);
     m->press(100, 150);
     m->takeLog();
