@@ -53,12 +53,10 @@ Q_SIGNALS:
     void folderNameChangeFromFileManager(FileManagerDefine::tagChangeFolderNameParam param);
 
 private:
-    static constexpr long SERVICE_ID = 36;
-
     EditTitlerController() = default;
     ~EditTitlerController() override;
 
     static EditTitlerController* mpInstance;
 
-    ServiceLink<IFileManagerController> mLink{SERVICE_ID};
+    ServiceLink<IFileManagerController> mLink;
 };

@@ -10,7 +10,7 @@ template <typename Service>
 class ServiceLink
 {
 public:
-    explicit ServiceLink(long serviceId) : m_serviceId(serviceId) {}
+    ServiceLink() = default;
     ~ServiceLink();
     ServiceLink(const ServiceLink&) = delete;
     ServiceLink& operator=(const ServiceLink&) = delete;
@@ -41,7 +41,6 @@ public:
     static constexpr int NO_CLIENT_ID = -1;
 
 private:
-    long m_serviceId;
     Service* m_proxy = nullptr; // owned by the factory
     int m_clientId = NO_CLIENT_ID;
     bool m_isConnected = false;
@@ -53,10 +52,10 @@ void ServiceLink<Service>::connectTo(TitlerToolFactory* factory, CallBack* callB
 {
     if (m_isConnected)
         return;
-    m_proxy = factory->createService<Service>(m_serviceId);
+    m_proxy = factory->createService<Service>();
     if (!m_proxy)
         return;
-    EarlyRequests::getInstance()->expectClientId(m_serviceId);
+    EarlyRequests::getInstance()->expectClientId(Service::INTERFACE_ID);
     m_proxy->registerCallBack(callBack);
 }
 
@@ -74,7 +73,7 @@ void ServiceLink<Service>::clientIdCame(int id, Notify* notify, Greeting greet)
     }
     m_isConnected = true;
     greet();
-    EarlyRequests::getInstance()->clientIdCame(m_serviceId);
+    EarlyRequests::getInstance()->clientIdCame(Service::INTERFACE_ID);
 }
 
 template <typename Service>

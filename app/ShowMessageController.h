@@ -59,8 +59,6 @@ Q_SIGNALS:
     void signalsShowMessageMaskWidget(bool show);
 
 private:
-    static constexpr long SERVICE_ID = 65;
-
     ShowMessageController();
     ~ShowMessageController() override;
 
@@ -69,7 +67,7 @@ private:
     static ShowMessageController* mInstance;
 
     int mLastMessageId = -1;
-    ServiceLink<IMessageCenter> mLink{SERVICE_ID};
+    ServiceLink<IMessageCenter> mLink;
     QMap<QString, QString> mMapData;
     QPointer<QWidget> mMainWindow;
     bool mTitlerIsTop = false;

@@ -17,13 +17,6 @@
 #include <QEvent>
 #include <new>
 
-namespace
-{
-
-constexpr long SOFT_KEYBOARD_SERVICE_ID = 95;
-
-}
-
 SiblingLinks::SiblingLinks()
 {
     MessageBoxController::setProvider(
@@ -74,7 +67,7 @@ void SiblingLinks::initProcessCommunications(WId window)
 void SiblingLinks::linkSoftKeyboard(WId window)
 {
     m_inputContext = KSInputContext::instance();
-    auto* keyboard = m_factory->createService<ISoftKeyBoardController>(SOFT_KEYBOARD_SERVICE_ID);
+    auto* keyboard = m_factory->createService<ISoftKeyBoardController>();
     if (!m_inputContext)
         return;
     m_inputContext->setWindowID(window);

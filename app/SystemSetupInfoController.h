@@ -39,13 +39,11 @@ Q_SIGNALS:
     void signalsSystemInfo(SystemSetupDef::emInformationModel model);
 
 private:
-    static constexpr long SERVICE_ID = 114;
-
     SystemSetupInfoController() = default;
     ~SystemSetupInfoController() override;
 
     static SystemSetupInfoController* mpInstance;
 
-    ServiceLink<ISystemSetupManager> mLink{SERVICE_ID};
+    ServiceLink<ISystemSetupManager> mLink;
     SystemSetupDef::tagSystemLanguageParam mLanguage;
 };

@@ -28,12 +28,10 @@ public:
     void postRestoreFocusNotify() override;
 
 private:
-    static constexpr long SERVICE_ID = 1;
-
     TitlerAPPEventFilterController() = default;
     ~TitlerAPPEventFilterController() override;
 
     static TitlerAPPEventFilterController* mInstance;
 
-    ServiceLink<IAPPEventFilter> mLink{SERVICE_ID};
+    ServiceLink<IAPPEventFilter> mLink;
 };

@@ -26,12 +26,10 @@ Q_SIGNALS:
     void signalPowerOff();
 
 private:
-    static constexpr long SERVICE_ID = 71;
-
     TitlerPowerController() = default;
     ~TitlerPowerController() override;
 
     static TitlerPowerController* mInstance;
 
-    ServiceLink<IPowerManager> mLink{SERVICE_ID};
+    ServiceLink<IPowerManager> mLink;
 };

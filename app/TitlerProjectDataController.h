@@ -23,12 +23,10 @@ public:
     void loadNotify(int state) override;
 
 private:
-    static constexpr long SERVICE_ID = 76;
-
     TitlerProjectDataController() = default;
     ~TitlerProjectDataController() override;
 
     static TitlerProjectDataController* mInstance;
 
-    ServiceLink<IProjectDataManager> mLink{SERVICE_ID};
+    ServiceLink<IProjectDataManager> mLink;
 };

@@ -50,10 +50,10 @@ public:
 
     // createInstance with the interface's type: createInstance hands out the interface pointer as void*.
     template <typename Interface>
-    Interface* createService(long id = Interface::INTERFACE_ID)
+    Interface* createService()
     {
         void* instance = nullptr;
-        createInstance(id, &instance);
+        createInstance(Interface::INTERFACE_ID, &instance);
         return static_cast<Interface*>(instance);
     }
 

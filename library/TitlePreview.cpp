@@ -31,8 +31,12 @@ QLabel* TitlePreview::createLabel(QWidget* parent, const QRect& area, const char
 }
 
 TitlePreview::TitlePreview(QWidget* parent, const QPoint& place)
-    : m_thumbnail(createLabel(parent, QRect(place, QSize(WIDTH, HEIGHT)), "folderThumbnail"))
-    , m_sizeLabel(createLabel(parent, QRect(place + QPoint(0, HEIGHT + SPACE), QSize(WIDTH, LABEL_HEIGHT)),
+    : m_thumbnail(createLabel(parent,
+                              QRect(place, QSize(FolderPicker::LEFT_WIDTH, FolderPicker::WIDGET_HEIGHT)),
+                              "folderThumbnail"))
+    , m_sizeLabel(createLabel(parent,
+                              QRect(place + QPoint(0, FolderPicker::WIDGET_HEIGHT + SPACE),
+                                    QSize(FolderPicker::LEFT_WIDTH, LABEL_HEIGHT)),
                               "folderFileSize"))
 {
     m_sizeLabel->setAlignment(Qt::AlignHCenter | Qt::AlignVCenter);

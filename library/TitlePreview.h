@@ -13,9 +13,6 @@ class QWidget;
 class TitlePreview
 {
 public:
-    static const int WIDTH = 240;
-    static const int HEIGHT = 135;
-
     // Shows nothing at first. The parent owns the labels and outlives this object; place is in its
     // coordinates.
     TitlePreview(QWidget* parent, const QPoint& place);
