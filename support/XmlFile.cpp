@@ -179,7 +179,9 @@ bool XmlFile::load(const std::string& path, TiXmlDocument& document)
     document.SetUserData(bytes.starts_with(BYTE_ORDER_MARK) ? &gMarked : nullptr);
     document.SetValue(path);
     document.SetTabSize(0); // nobody asks for the line and column of an element
-    document.Parse(bytes.c_str(), nullptr, TIXML_ENCODING_UNKNOWN);
+    // The bytes are UTF-8 whatever the declaration says. As another encoding TinyXML would make one byte of each
+    // character reference, a NUL of some.
+    document.Parse(bytes.c_str(), nullptr, TIXML_ENCODING_UTF8);
     return !document.Error();
 }
 
@@ -193,8 +195,7 @@ std::string XmlFile::toBytes(const TiXmlDocument& document)
     Printer printer;
     printer.print(document);
     std::string bytes = printer.take();
-    // A reference in a file without an encoding was read as a byte of its own. Such bytes would make the file
-    // unreadable from here on.
+    // Bytes that are not UTF-8 would make the file unreadable from here on.
     if (!Utf8::isValid(bytes))
         bytes = Utf8::repaired(bytes);
     return bytes;

@@ -46,7 +46,7 @@ int depthOf(const TiXmlNode* node)
 bool tinyXmlAccepts(const std::string& bytes, int* depth = nullptr)
 {
     TiXmlDocument document;
-    document.Parse(bytes.c_str(), nullptr, TIXML_ENCODING_UNKNOWN);
+    document.Parse(bytes.c_str(), nullptr, TIXML_ENCODING_UTF8);
     if (depth)
         *depth = depthOf(&document);
     return !document.Error();
@@ -240,7 +240,7 @@ private Q_SLOTS:
         QFETCH(QByteArray, bytes);
         const std::string path = write(bytes).toStdString();
         TiXmlDocument expected;
-        QVERIFY(expected.LoadFile(path.c_str(), TIXML_ENCODING_UNKNOWN));
+        QVERIFY(expected.LoadFile(path.c_str(), TIXML_ENCODING_UTF8));
         TiXmlDocument document;
         QVERIFY(XmlFile::load(path, document));
         QCOMPARE(document.ValueStr(), path);
@@ -251,17 +251,30 @@ private Q_SLOTS:
         QCOMPARE(read(QString::fromStdString(path)), read(expectedPath));
     }
 
-    // Without an encoding a reference is one byte, whatever it stands for.
-    void whatWasReadIsReadableWhenSaved()
+    void referencesAreCharactersInEveryEncoding_data()
     {
-        const std::string path = write("<r a=\"&#xA0;&#xE4;\">&#xFF;<b/></r>").toStdString();
+        QTest::addColumn<QByteArray>("declaration");
+        QTest::newRow("none") << QByteArray();
+        QTest::newRow("no encoding") << QByteArray("<?xml version=\"1.0\"?>");
+        QTest::newRow("UTF-8") << QByteArray("<?xml version=\"1.0\" encoding=\"utf-8\"?>");
+        QTest::newRow("another") << QByteArray("<?xml version=\"1.0\" encoding=\"latin1\"?>");
+        QTest::newRow("unknown") << QByteArray("<?xml version=\"1.0\" encoding=\"T8-UF\"?>");
+    }
+
+    // As bytes, some of them would be NUL or no UTF-8, and the saved file could not be read.
+    void referencesAreCharactersInEveryEncoding()
+    {
+        QFETCH(QByteArray, declaration);
+        const std::string path =
+            write(declaration + "<r a=\"&#xA0;&#xE4;&#x1F600;&#x100;\">&#xFF;<b/></r>").toStdString();
         TiXmlDocument document;
         QVERIFY(XmlFile::load(path, document));
         QVERIFY(XmlFile::save(document, path));
         QVERIFY(XmlFileGuard::accepts(read(QString::fromStdString(path)).toStdString()));
         TiXmlDocument again;
         QVERIFY(XmlFile::load(path, again));
-        QCOMPARE(QByteArray(again.RootElement()->Attribute("a")), QByteArray("\xEF\xBF\xBD\xEF\xBF\xBD"));
+        QCOMPARE(QByteArray(again.RootElement()->Attribute("a")), QByteArray("\u00A0ä\U0001F600\u0100"));
+        QCOMPARE(QByteArray(again.RootElement()->FirstChild()->Value()), QByteArray("ÿ"));
     }
 
     void refusesWhatIsNoPlainFile()
