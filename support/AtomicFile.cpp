@@ -17,6 +17,8 @@
 namespace
 {
 
+constexpr int READ_ATTEMPTS = 3;
+
 // A file descriptor that closes itself.
 class Descriptor
 {
@@ -170,6 +172,32 @@ bool replaceFile(const std::string& path, AtomicFile::Durability durability, Ato
     return isDone;
 }
 
+bool readOnce(const std::string& path, std::size_t maximum, std::string& bytes)
+{
+    const Descriptor descriptor(::open(path.c_str(), O_RDONLY | O_CLOEXEC | O_NONBLOCK));
+    struct stat status = {};
+    if (!descriptor.isOpen() || ::fstat(descriptor.get(), &status) != 0)
+        return false;
+    if (!S_ISREG(status.st_mode) || static_cast<std::uintmax_t>(status.st_size) > maximum) {
+        errno = EINVAL;
+        return false;
+    }
+    bytes.resize(static_cast<std::size_t>(status.st_size));
+    std::size_t size = 0;
+    while (size < bytes.size()) {
+        const ssize_t count = ::read(descriptor.get(), bytes.data() + size, bytes.size() - size);
+        if (count < 0 && errno == EINTR)
+            continue;
+        if (count < 0)
+            return false;
+        if (count == 0)
+            break;
+        size += static_cast<std::size_t>(count);
+    }
+    bytes.resize(size);
+    return true;
+}
+
 } // namespace
 
 bool AtomicFile::write(const std::string& path, std::string_view bytes, Durability durability, Links links)
@@ -194,23 +222,12 @@ bool AtomicFile::copy(const std::string& source, const std::string& target, Dura
 
 bool AtomicFile::read(const std::string& path, std::size_t maximum, std::string& bytes)
 {
-    const Descriptor descriptor(::open(path.c_str(), O_RDONLY | O_CLOEXEC | O_NONBLOCK));
-    struct stat status = {};
-    if (!descriptor.isOpen() || ::fstat(descriptor.get(), &status) != 0 || !S_ISREG(status.st_mode) ||
-        static_cast<std::uintmax_t>(status.st_size) > maximum)
-        return false;
-    bytes.resize(static_cast<std::size_t>(status.st_size));
-    std::size_t size = 0;
-    while (size < bytes.size()) {
-        const ssize_t count = ::read(descriptor.get(), bytes.data() + size, bytes.size() - size);
-        if (count < 0 && errno == EINTR)
-            continue;
-        if (count < 0)
+    // A disk that stumbles once must not make a title disappear from its list.
+    for (int attempt = 1; attempt < READ_ATTEMPTS; ++attempt) {
+        if (readOnce(path, maximum, bytes))
+            return true;
+        if (errno != EIO)
             return false;
-        if (count == 0)
-            break;
-        size += static_cast<std::size_t>(count);
     }
-    bytes.resize(size);
-    return true;
+    return readOnce(path, maximum, bytes);
 }

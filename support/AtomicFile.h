@@ -37,7 +37,7 @@ public:
     static bool copy(const std::string& source, const std::string& target,
                      Durability durability = Durability::Automatic);
 
-    // Reads a plain file of at most maximum bytes; false otherwise. Never waits on a pipe or device. Any
-    // thread.
+    // Reads a plain file of at most maximum bytes; false otherwise, errno says why. Tries again when the disk
+    // reports an error. Never waits on a pipe or device. Any thread.
     static bool read(const std::string& path, std::size_t maximum, std::string& bytes);
 };

@@ -179,8 +179,8 @@ bool XmlFile::load(const std::string& path, TiXmlDocument& document)
     document.SetUserData(bytes.starts_with(BYTE_ORDER_MARK) ? &gMarked : nullptr);
     document.SetValue(path);
     document.SetTabSize(0); // nobody asks for the line and column of an element
-    // The bytes are UTF-8 whatever the declaration says. As another encoding TinyXML would make one byte of each
-    // character reference, a NUL of some.
+    // The bytes are UTF-8 whatever the declaration says. As another encoding TinyXML would make one byte of
+    // each character reference, a NUL of some.
     document.Parse(bytes.c_str(), nullptr, TIXML_ENCODING_UTF8);
     return !document.Error();
 }
