@@ -94,7 +94,7 @@ private:
     template <typename CallBack>
     bool giveClientId(void (CallBack::*give)(int), const QString& service, int id);
     void unregister(const QString& service, const QString& method, int clientId);
-    // method is the id of a method of the service.
+    // method is the id of a method of that service.
     void answer(long interfaceId, long method, const QJsonObject& args);
     void answerMessageCenter(long method, const QJsonObject& args);
     void answerEventFilter(long method, const QJsonObject& args);

@@ -13,7 +13,7 @@ class ArchiveOrder;
 
 // Provides the widgets with title storage in terms of QString. Adds to ArchiveManager the copying of
 // pictures, free names, new order files, and the removal of titles that no order file lists. Cheap to
-// construct: each user makes its own, in any thread.
+// construct: each user constructs its own, in any thread.
 class ArchiveController
 {
 public:

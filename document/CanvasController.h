@@ -9,7 +9,7 @@ class ArchiveManager;
 class FontStyle;
 
 // Provides the canvas with storage: saves a title and loads the last text style. Cheap to construct: a worker
-// thread that saves makes its own.
+// thread that saves constructs its own.
 class CanvasController
 {
 public:

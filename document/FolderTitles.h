@@ -7,8 +7,8 @@
 
 class Archive;
 
-// Gives access to the titles of a folder in the order of its order file, for users that need a few of many
-// titles. The rows are read by the constructor, a title on each request. Immutable, so any thread may read.
+// Reads the titles of a folder in the order of its order file, for users that need only a few of many titles.
+// The rows are read by the constructor, each title when it is requested. Immutable, so any thread may read.
 class FolderTitles
 {
 public:

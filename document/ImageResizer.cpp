@@ -42,8 +42,8 @@ QImage with32Bits(const QImage& image)
     return image.convertToFormat(image.hasAlphaChannel() ? QImage::Format_ARGB32 : QImage::Format_RGB32);
 }
 
-// Reads the checker picture. If it exists but cannot be read at the moment, returns the last one: a small
-// picture that cannot be made now would not be made later either.
+// Reads the checker picture. If it exists but cannot be read at the moment, returns the last one that was
+// read, because the small picture of this save is not generated again later.
 QImage readChecker(const QString& path)
 {
     static QString lastPath;

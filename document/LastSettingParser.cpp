@@ -57,8 +57,8 @@ bool LastSettingParser::editTempFile(const std::string& element, const std::stri
     return save(document);
 }
 
-// A failure is only logged: it means that the next session starts with another title, which the operator need
-// not be told.
+// Failures are logged but not shown to the operator: they only mean that the next session starts with another
+// title.
 bool LastSettingParser::save(const TiXmlDocument& document)
 {
     if (mFilePath.empty() || XmlFile::save(document, mFilePath))

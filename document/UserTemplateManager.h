@@ -70,6 +70,6 @@ private:
 
     static UserTemplateManager* mInstance;
     std::string mRootFolder;
-    std::string mSettingFolder; // of the file with the last template; the same folder
+    std::string mSettingFolder; // folder of the file with the last template; equals mRootFolder
     std::vector<std::string> mFolderList;
 };

@@ -12,8 +12,8 @@ class ConfinedPath
 public:
     ConfinedPath() = delete;
 
-    // Returns whether path lies below folder, at any depth, after the links in both are resolved; false for
-    // the folder itself. Components that do not exist yet are compared by name; a dangling link is refused.
+    // Returns whether path is below folder, at any depth, after the links in both are resolved; false for the
+    // folder itself. Components that do not exist yet are compared by name; a dangling link is refused.
     static bool isBelow(const std::string& folder, const std::string& path);
 
     // As above for a folder of the appliance, such as &IPathManagerEx::getTitleResourcesPath. Returns false
@@ -21,7 +21,7 @@ public:
     static bool isBelow(FolderLookup::Getter root, const std::string& path);
 
     // Returns the path of a picture that a title file in folder names. Logs and returns an empty string if
-    // the picture lies neither below folder nor below the folders of titles and templates.
+    // the picture is neither below folder nor below the folders of titles and templates.
     static std::string namedByTitle(const std::string& folder, const std::string& path);
 
     // Returns the path of a title that the order file of a folder names. Logs and returns an empty string if
@@ -29,7 +29,7 @@ public:
     // templates. An empty name is refused without logging.
     static std::string namedByOrder(const std::string& folder, const std::string& name);
 
-    // Writes a refusal to the debug log; what names the source of the path. The two functions above call this
-    // only once for each path.
+    // Writes a refusal to the debug log. what is the beginning of the text and describes the source of the
+    // path. The two functions above log each path only once.
     static void logRefusal(const std::wstring& what, const std::string& path);
 };

@@ -37,7 +37,7 @@ class Queue
 {
 public:
     // Never destroyed, because its thread may run until the process ends. LeftoverSweep cleans up at the next
-    // start what is unfinished then.
+    // start.
     static Queue& instance()
     {
         static Queue* const queue = new Queue;

@@ -40,7 +40,7 @@ public:
     // reader, and their previous version is still kept.
     static std::vector<std::string> unsynced();
     static bool hasFailed();
-    // Writes and queues the files that could not be synced once more.
+    // Writes and queues again the files that could not be synced.
     static void retryFailed();
     // Sets the function that the background thread calls when a sync has failed; null removes it.
     static void setListener(std::function<void()> listener);

@@ -59,7 +59,7 @@ long long folderBytes(const fs::path& folder)
     return sum;
 }
 
-// Whether path is folder or lies below it.
+// Returns whether path is folder itself or below it.
 bool isWithin(const fs::path& folder, const fs::path& path)
 {
     boost::system::error_code error;

@@ -38,7 +38,7 @@ public:
     // rounded up.
     static long long getFolderSize(const std::wstring& folder);
 
-    // Removes one file or one empty folder.
+    // Deletes one file or one empty folder.
     static bool deleteFile(const std::string& path);
 
     // Copies a file, or a folder with its contents, and creates missing folders. Existing files are

@@ -37,8 +37,7 @@ QString applicationName()
     return application == nullptr ? QString() : application->objectName();
 }
 
-// Returns whether the keyboard service alone decides if its window counts as open, which holds for this
-// application.
+// Returns whether the keyboard service alone decides if its window counts as open. True for this application.
 bool serviceOwnsState()
 {
     return applicationName() == QLatin1String("Titler");

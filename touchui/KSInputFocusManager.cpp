@@ -13,8 +13,8 @@ int ignoreError(Display*, XErrorEvent*)
     return 0;
 }
 
-// A display connection on which an error, for example because a window was just closed, does not end the
-// process.
+// Opens a display connection. While it is open, X11 errors, for example for a window that was just closed, do
+// not end the process.
 class DisplayConnection
 {
 public:

@@ -154,7 +154,7 @@ public:
     bool getHasSeparator() const { return m_hasSeparator; }
     // Returns the previous status.
     bool setMinitrimStatus(bool status) { return m_touch.setMinitrimStatus(status); }
-    // While set, a touch is left to the item under it.
+    // While set, the list does not handle touches that begin, but leaves them to the item under the finger.
     void setIsTake(bool isTake) { m_touch.setIsTake(isTake); }
     bool itemsCanDrag() const { return m_touch.itemsCanDrag(); }
 

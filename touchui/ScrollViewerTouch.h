@@ -67,7 +67,7 @@ public:
 
     // Sets the horizontal range outside of which presses select no item.
     void setEffectiveArea(int left, int width);
-    // While set, a touch is left to the item under it.
+    // While set, the list does not handle touches that begin, but leaves them to the item under the finger.
     void setIsTake(bool isTake) { m_isTake = isTake; }
     // Returns the previous status.
     bool setMinitrimStatus(bool status) { return std::exchange(m_minitrim, status); }

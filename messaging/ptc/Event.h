@@ -25,9 +25,9 @@ public:
     void* getData() const { return m_data; }
     void setData(void* data) { m_data = data; }
     long getSize() const { return m_size; }
-    // Whether the event is for a callback adapter instead of a service adapter.
+    // Returns whether the event is for a callback adapter instead of a service adapter.
     bool isCallback() const { return m_callback; }
-    // Whether the call goes to another process.
+    // Returns whether the call is sent to another process.
     bool isRemote() const { return m_remote; }
 
 private:

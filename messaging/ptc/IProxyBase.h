@@ -20,7 +20,7 @@ public:
 class IProxy : public IProxyBase
 {
 public:
-    // Both are needed to register callbacks. Not owned.
+    // Set the objects that are needed to register callbacks. Not owned.
     virtual void setAdapterFactory(IAdapterFactory* factory) = 0;
     virtual void setReceiver(IReceiver* receiver) = 0;
 };

@@ -19,7 +19,7 @@ namespace ServiceCall
 // The meaning of a row of a service's table, derived from the type of its parameter.
 enum class Kind { Call, RegisterCallBack, RegisterNotify };
 
-// Gives the type that is packed for a parameter. A registration is sent as a record of ids.
+// Defines the type that is packed for a parameter. A registration is sent as a record of ids.
 template <typename Parameter>
 struct Packed {
     using Type = Parameter;
