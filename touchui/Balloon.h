@@ -14,8 +14,8 @@ class QPainter;
 class QTimer;
 class QWidget;
 
-// A balloon beside a widget: the purpose of a button, below it, or a prompt above the widget that it refers
-// to. It is hidden by hide(), together with the widget, or after its time. GUI thread only.
+// A balloon beside a widget. It shows the purpose of a button below it, or a prompt above the widget that the
+// prompt refers to. It is hidden by hide(), together with the widget, or after its time. GUI thread only.
 class Balloon : public QObject
 {
     Q_OBJECT

@@ -346,7 +346,7 @@ bool KSCombobox::event(QEvent* event)
     return m_finger.takes(event) || QComboBox::event(event);
 }
 
-// Releases the box, and a pressed line edit without a click.
+// Releases the box and, if its line edit is pressed, releases that without a click.
 void KSCombobox::comeUp()
 {
     setPressed(false);

@@ -370,7 +370,7 @@ void KSMenu::drawBalloon(QPainter& painter) const
     if (m_arrow.isNull()) {
         return;
     }
-    // The picture points up and includes a part of the frame below the arrow.
+    // The arrow's picture points up. Its lower part overlaps the frame.
     painter.save();
     switch (place.side) {
     case ArrowSide::Top:

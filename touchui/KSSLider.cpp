@@ -194,7 +194,7 @@ void KSSLider::mouseReleaseEvent(QMouseEvent* event)
     letGo();
 }
 
-// Ends a press, wherever the handle is.
+// Ends the current press and leaves the handle where it is.
 void KSSLider::letGo()
 {
     if (m_dragging) {

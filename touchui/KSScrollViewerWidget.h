@@ -152,7 +152,7 @@ public:
     KSScrollBar* getVScrollBar() const { return m_bar; }
     Qt::Alignment getVScrollBarAlignment() const { return m_barAlignment; }
     bool getHasSeparator() const { return m_hasSeparator; }
-    // Returns the previous status.
+    // Returns the status that was set before.
     bool setMinitrimStatus(bool status) { return m_touch.setMinitrimStatus(status); }
     // While set, the list does not handle touches that begin, but leaves them to the item under the finger.
     void setIsTake(bool isTake) { m_touch.setIsTake(isTake); }

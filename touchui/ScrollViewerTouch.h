@@ -69,7 +69,7 @@ public:
     void setEffectiveArea(int left, int width);
     // While set, the list does not handle touches that begin, but leaves them to the item under the finger.
     void setIsTake(bool isTake) { m_isTake = isTake; }
-    // Returns the previous status.
+    // Returns the status that was set before.
     bool setMinitrimStatus(bool status) { return std::exchange(m_minitrim, status); }
 
     bool itemsCanDrag() const { return m_itemsCanDrag; }

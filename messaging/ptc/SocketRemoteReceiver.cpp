@@ -133,7 +133,7 @@ void SocketRemoteReceiver::connectListeners(void* receiver)
     try {
         static_cast<SocketRemoteReceiver*>(receiver)->waitClientLink();
     } catch (const boost::thread_interrupted&) {
-        return; // thrown when the receiver is destroyed
+        return; // the destructor has interrupted this thread
     }
 }
 
