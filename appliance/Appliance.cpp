@@ -163,8 +163,7 @@ bool Appliance::giveClientId(void (CallBack::*give)(int), const QString& service
     return true;
 }
 
-// A client that registers again, because it was started anew, gets a new id. The services of the sub panel
-// give none.
+// A client that registers again after a restart gets a new id. The services of the sub panel assign no ids.
 void Appliance::giveClientId(const QString& service)
 {
     const int id = m_lastClientId + 1;

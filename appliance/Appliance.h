@@ -1,5 +1,3 @@
-// The processes that surround a titler, in one: the main process and the sub panel process with the services
-// that a titler calls, their state, and the caller of the titler. Everything lives in one thread.
 #pragma once
 
 #include "appliance/Sibling.h"
@@ -15,27 +13,29 @@
 #include <memory>
 #include <optional>
 
+// Stands in for the processes that surround a titler: the main process and the sub panel process with the
+// services that a titler calls, their state, and the caller of the titler. Everything runs in one thread.
 class Appliance : private ITitlerCallBack
 {
 public:
     using EventSink = std::function<void(const QJsonObject& event)>;
 
-    // Every call of a titler goes to the sink as {"event":"call","service":..,"method":..,"args":{..}}, every
-    // result as
-    // {"event":"callback",..}.
+    // The sink receives every call of a titler as
+    //     {"event":"call","service":..,"method":..,"args":{..}}
+    // and every result as {"event":"callback",..}.
     explicit Appliance(EventSink sink);
     ~Appliance() override;
 
-    // Listens as both processes. False when a port cannot be bound.
+    // Starts to listen as both processes. Returns false if a port cannot be bound.
     bool start();
-    // Whether both processes are connected to the titler; tries once.
+    // Tries once to connect both processes to the titler; returns whether they are connected.
     bool connectToTitler();
-    // Null while the titler does not listen.
+    // Returns null while the titler does not listen.
     ITitler* titler();
-    // Registers for the results of create sessions. False while the titler does not listen.
+    // Registers for the results of create sessions. Returns false while the titler does not listen.
     bool registerAtTitler();
 
-    // The client's side of a service, by its interface. Null until a client has registered it.
+    // Returns the proxy for a client's callback interface; null until a client has registered it.
     template <typename CallBack>
     CallBack* callBackOf()
     {
@@ -46,17 +46,18 @@ public:
     {
         return dynamic_cast<Notify*>(m_clients[Notify::Calls::NAME].notify.get());
     }
-    // The id that the service gave its client, -1 before.
+    // Returns the id that the service has assigned to its client; -1 before.
     int clientIdOf(const QString& service);
 
-    // The oldest call that came in and was not taken yet; at most KEPT_CALLS are kept.
+    // Removes and returns the oldest call to the method that was not taken yet. At most KEPT_CALLS calls are
+    // kept.
     std::optional<QJsonObject> takeCall(const QString& service, const QString& method);
     int countCalls(const QString& service, const QString& method) const;
-    // The oldest result that was not taken yet.
+    // Removes and returns the oldest result that was not taken yet.
     std::optional<QJsonObject> takeResult();
     void forgetCallsAndResults();
 
-    // State that the services answer with.
+    // The state that the services report.
     struct State {
         int systemLanguage = 1;
         int inputLanguage = 1;
@@ -66,9 +67,9 @@ public:
     State state;
 
     struct Options {
-        bool keyEcho = true;      // the soft keyboard sends keys back that it is sent
-        bool stateOnClose = true; // it tells its state when it is closed
-        bool eventEcho = true;    // touch lock announcements go to all clients, their sender too
+        bool keyEcho = true;      // the soft keyboard sends received keys back
+        bool stateOnClose = true; // the soft keyboard reports its state when it is closed
+        bool eventEcho = true;    // touch lock announcements go to all clients, including the sender
     };
     Options options;
 
@@ -93,7 +94,7 @@ private:
     template <typename CallBack>
     bool giveClientId(void (CallBack::*give)(int), const QString& service, int id);
     void unregister(const QString& service, const QString& method, int clientId);
-    // method is the id of a method of the service.
+    // method is the id of a method of that service.
     void answer(long interfaceId, long method, const QJsonObject& args);
     void answerMessageCenter(long method, const QJsonObject& args);
     void answerEventFilter(long method, const QJsonObject& args);

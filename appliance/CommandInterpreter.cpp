@@ -162,7 +162,7 @@ void CommandInterpreter::addTitlerCommands()
         return QString();
     });
     m_handlers["edit"] = withTitler([](ITitler& titler, const CommandLine& command) {
-        // The type may follow a path in quotes, or one without blanks.
+        // The type may follow a path in quotes or a path without blanks.
         bool isType = command.arguments().size() == 2;
         const int type = isType ? command.number(1, &isType) : 0;
         const QString path = isType ? command.arguments().first() : command.rest();
@@ -366,7 +366,7 @@ void CommandInterpreter::addFileCommands()
     });
 }
 
-// State is kept also while no client is there, and answered to the next.
+// The state is kept while no client is connected, and reported to the next one.
 void CommandInterpreter::addStateCommands()
 {
     m_handlers["language"] = [this](const CommandLine& command) {

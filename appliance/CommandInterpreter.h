@@ -1,9 +1,3 @@
-// Drives an appliance by lines of text, and answers each with an event.
-//
-// Lines are carried out in their order; a wait holds back those behind it. A line that was carried out gives
-// {"event":"ok","command":..}, one that cannot be gives {"event":"error","command":..,"message":..}, a wait
-// that takes too long
-// {"event":"timeout","command":..}.
 #pragma once
 
 #include "appliance/Appliance.h"
@@ -17,6 +11,12 @@
 #include <functional>
 #include <map>
 
+// Controls an appliance by lines of text and answers each line with an event.
+//
+// Lines are executed in order; a wait delays the lines behind it. The events are
+//     {"event":"ok","command":..} for a line that was executed,
+//     {"event":"error","command":..,"message":..} for one that cannot be executed,
+//     {"event":"timeout","command":..} for a wait that takes too long.
 class CommandInterpreter : public QObject
 {
     Q_OBJECT
@@ -28,19 +28,19 @@ public:
     CommandInterpreter(Appliance& appliance, Appliance::EventSink sink, QObject* parent = nullptr);
     ~CommandInterpreter() override;
 
-    // Carries the line out, or keeps it until the wait before it is over. Empty lines and lines that begin
-    // with # do nothing.
+    // Executes the line, or queues it while a wait is pending. Ignores empty lines and lines that begin with
+    // #.
     void addLine(const QString& line);
-    // Asks for the end once all lines are carried out.
+    // Requests the end of the program after all lines are executed.
     void endOfInput();
 
 Q_SIGNALS:
     void quitRequested();
 
 private:
-    // Returns what is wrong, or an empty text.
+    // Returns an error message, or an empty text on success.
     using Handler = std::function<QString(const CommandLine& command)>;
-    // True once what is waited for has come, with its event sent.
+    // Returns whether the awaited condition has occurred; if so, has sent its event.
     using Condition = std::function<bool()>;
 
     void addTitlerCommands();

@@ -40,7 +40,7 @@ CommandLine::CommandLine(const QString& line) : m_line(line)
     if (wordEnd == -1) {
         return;
     }
-    // Blanks at the end of the line belong to a text.
+    // Keep blanks at the end of the line; they belong to a text argument.
     const QString behind = line.mid(line.indexOf(m_word) + m_word.size() + 1);
     qsizetype at = 0;
     bool onlyOneQuoted = false;

@@ -1,9 +1,9 @@
-// One line of the appliance's line protocol: a word and its arguments.
 #pragma once
 
 #include <QString>
 #include <QStringList>
 
+// One line of the appliance's line protocol: a command word and its arguments.
 class CommandLine
 {
 public:
@@ -11,12 +11,14 @@ public:
 
     QString line() const { return m_line; }
     QString word() const { return m_word; }
-    // Separated by blanks; double quotes keep blanks, and within them \" \\ and \n stand for a quote, a
-    // backslash, a line end.
+    // Returns the arguments, which are separated by blanks. Double quotes protect blanks; within them \", \\
+    // and \n stand for a quote, a backslash and a line feed.
     QStringList arguments() const { return m_arguments; }
-    // Everything behind the word as it stands, or the text between quotes when all of it is quoted.
+    // Returns everything behind the command word unchanged, or without its quotes if it is a single quoted
+    // text.
     QString rest() const { return m_rest; }
-    // The argument as a number, or the fallback where there is none. valid becomes false for something else.
+    // Return the argument as a number, or the fallback if it is missing. valid becomes false if it is not a
+    // number.
     int number(int index, bool* valid) const;
     int number(int index, int fallback, bool* valid) const;
 

@@ -1,4 +1,3 @@
-// The records of the wire as JSON objects, with the fields' own names.
 #pragma once
 
 #include "messaging/services/RecordPacking.h"
@@ -7,6 +6,7 @@
 #include <QJsonObject>
 #include <QString>
 
+// Converts the records of the wire to and from JSON objects with the same field names.
 namespace JsonRecords
 {
 
@@ -45,7 +45,7 @@ QJsonObject toJson(const Record& record)
     });
     return json;
 }
-// With the paths unpacked.
+// Also unpacks the paths.
 QJsonObject toJson(const _CALLBACK_TITLER_PARAMTER& record);
 
 inline void fromValue(const QJsonValue& json, int& value)
@@ -61,7 +61,7 @@ inline void fromValue(const QJsonValue& json, std::wstring& value)
     value = json.toString().toStdWString();
 }
 
-// Returns a record of numbers and texts. A field that the object does not have is zero or empty.
+// Returns a record of numbers and texts. Fields that are missing in the object are zero or empty.
 template <RecordPacking::HasFields Record>
 Record fromJson(const QJsonObject& json)
 {

@@ -24,7 +24,7 @@ std::vector<Key> pressAndRelease(int code, int modifiers, const QString& text)
     return {press, release};
 }
 
-// What a key types by itself.
+// Returns the text that a key produces without modifiers.
 QString textOfKey(int code)
 {
     static const QMap<int, QString> texts = {

@@ -1,4 +1,3 @@
-// Key presses and releases as the soft keyboard sends them.
 #pragma once
 
 #include "messaging/services/SubCommonDefine.h"
@@ -7,16 +6,17 @@
 
 #include <vector>
 
+// Makes key presses and releases as the soft keyboard sends them.
 namespace KeyStrokes
 {
 
-// Event type of the key record that tells of the closed keyboard.
+// Event type of the key record that reports that the keyboard was closed.
 constexpr int KEYBOARD_CLOSED = 1100;
 
-// Press and release of a key by its name without "Key_" ("Return", "Left", "Ctrl+Z"), or empty when there is
-// none of that name. A single character is no name.
+// Returns press and release of a key by its name without "Key_" ("Return", "Left", "Ctrl+Z"). Returns an
+// empty list for an unknown name and for a single character.
 std::vector<SubCommonDefine::tagSoftKeyBoardKeyData> ofName(const QString& name);
-// Press and release of each character.
+// Returns press and release of each character.
 std::vector<SubCommonDefine::tagSoftKeyBoardKeyData> ofText(const QString& text);
 
 } // namespace KeyStrokes

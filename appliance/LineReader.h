@@ -1,23 +1,23 @@
-// Reads a descriptor line by line while the event loop runs.
 #pragma once
 
 #include <QByteArray>
 #include <QObject>
 #include <QSocketNotifier>
 
+// Reads a descriptor line by line while the event loop runs.
 class LineReader : public QObject
 {
     Q_OBJECT
 
 public:
-    // A line longer than this is cut there.
+    // Longer lines are split at this length in bytes.
     static constexpr qsizetype MAX_LINE = 1 << 20;
 
-    // The descriptor stays the caller's and must be readable.
+    // descriptor must be readable; it is not closed here.
     explicit LineReader(int descriptor, QObject* parent = nullptr);
 
 Q_SIGNALS:
-    // UTF-8 without the line end.
+    // Emitted for each line, decoded from UTF-8 and without the line feed.
     void lineRead(const QString& line);
     void ended();
 

@@ -11,7 +11,8 @@
 namespace
 {
 
-// Places are given on this raster, in multiples of three, so that edges are sharp at two thirds of it, too.
+// Coordinates are given on this raster, in multiples of three, so that edges are also sharp on the 1280 x 720
+// raster.
 constexpr int WIDTH = 1920;
 constexpr int HEIGHT = 1080;
 
@@ -41,7 +42,7 @@ QImage painted(const QSize& raster, void (*paint)(QPainter&))
     return image;
 }
 
-// A shadow that grows fainter outwards, as of light from above.
+// Paints a shadow that fades outwards, as if lit from above.
 void softShadow(QPainter& painter, const QRectF& plate, double radius)
 {
     constexpr int RINGS = 26;
@@ -65,7 +66,7 @@ void fillDown(QPainter& painter, const QRectF& area, const QColor& top, const QC
     painter.fillRect(area, face);
 }
 
-// Fills from full at the left to nothing at the right.
+// Fills the area with a gradient from opaque at the left to transparent at the right.
 void fillFading(QPainter& painter, const QRectF& area, const QColor& color, double solidPart)
 {
     QLinearGradient face(area.topLeft(), area.topRight());
@@ -110,7 +111,7 @@ void paintFullScreen(QPainter& painter)
     ground.setColorAt(0.55, withAlpha(NAVY, 248));
     ground.setColorAt(1, QColor(4, 10, 24, 252));
     painter.fillRect(all, ground);
-    // Slanted ribbons, the brighter the nearer to the light.
+    // Slanted ribbons; those nearer to the light are brighter.
     struct Ribbon {
         double left;
         double width;
@@ -136,7 +137,8 @@ void paintFullScreen(QPainter& painter)
     painter.fillRect(QRectF(195, 711, 180, 9), AMBER);
 }
 
-// One half of a quotation mark: a disk with a tail that curls up from its left side, in a box of 108 by 150.
+// Returns one half of a quotation mark: a disk with a tail that curls up from its left side, in a box of 108
+// by 150.
 QPainterPath quotationHalf(double x, double y)
 {
     QPainterPath mark;

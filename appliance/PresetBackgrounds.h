@@ -1,10 +1,10 @@
-// Backgrounds of the preset templates. Each is painted for the raster it is asked for, 16 by 9, and is
-// transparent wherever it covers nothing. The same every time.
 #pragma once
 
 #include <QImage>
 #include <QSize>
 
+// Paints the backgrounds of the preset templates. Each is painted for the requested raster of 16 by 9 and is
+// transparent outside its shapes. The result is always the same.
 class PresetBackgrounds
 {
 public:
@@ -12,7 +12,7 @@ public:
     static QImage lowerThird(const QSize& raster);
     // A bar across the whole width with a tag at its left end.
     static QImage strap(const QSize& raster);
-    // Covers the whole picture; what lies behind still shimmers through.
+    // Covers the whole picture, but is slightly transparent.
     static QImage fullScreen(const QSize& raster);
     // A panel in the middle with a large quotation mark.
     static QImage quote(const QSize& raster);

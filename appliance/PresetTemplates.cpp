@@ -13,20 +13,20 @@ constexpr const char* AMBER = "#FFB81C";
 constexpr const char* NAVY = "#0B2159";
 constexpr const char* BLACK = "#000000";
 
-// The words of a design in both languages, how they look, and where they stand on the 1920 wide raster: their
-// left edge, middle or right edge, and the middle of the capitals of the first line.
+// The texts of a design in both languages, their look, and their position on the 1920 wide raster: x is the
+// left edge, middle or right edge, by the alignment; y is the middle of the capitals of the first line.
 struct Words {
     const char* english;
     const char* chinese;
     Look look;
     double x;
     double y;
-    int chineseSize = 0; // where lines of ideographs, which are taller, need another; 0 for the same
+    int chineseSize = 0; // font size for ideographs, which are taller; 0 for the same as in look
 };
 
 struct Design {
     const char* name;
-    QImage (*background)(const QSize&); // null for none
+    QImage (*background)(const QSize&); // null if there is none
     std::vector<Words> words;
 };
 
@@ -121,7 +121,7 @@ std::vector<SampleTitles::Sample> PresetTemplates::samples(bool chinese)
             if (chinese && words.chineseSize > 0) {
                 look.size = words.chineseSize;
             }
-            look.italic = chinese ? 0 : look.italic; // ideographs do not lean
+            look.italic = chinese ? 0 : look.italic; // no italics for ideographs
             const char* text = chinese ? words.chinese : words.english;
             lines.push_back({text, SampleText::placed(look, text, words.x, words.y)});
         }

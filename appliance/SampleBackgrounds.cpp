@@ -30,7 +30,7 @@ void paintBar(QPainter& painter, int top, int alpha)
     painter.fillRect(0, top, WIDTH, 6, QColor(230, 168, 23, alpha));
 }
 
-// One row of buildings from left to right; far rows are paler and have fewer lit windows.
+// Paints one row of buildings from left to right; distant rows are paler and have fewer lit windows.
 void paintBuildings(QPainter& painter, QRandomGenerator& random, const QColor& wall, int ground, int tallest,
                     int litPercent)
 {

@@ -1,8 +1,8 @@
-// Background pictures of the sample titles, painted at 1920x1080. The same every time.
 #pragma once
 
 #include <QImage>
 
+// Paints the background pictures of the sample titles, 1920x1080. The result is always the same.
 class SampleBackgrounds
 {
 public:
@@ -13,6 +13,6 @@ public:
     // A bar along the bottom, transparent elsewhere.
     static QImage lowerThird();
 
-    // Two shades of grey in squares, which stand for transparent parts.
+    // Two shades of grey in squares, as the background of transparent pictures.
     static QImage checker(const QSize& size);
 };

@@ -81,7 +81,7 @@ SampleText::Look SampleText::placed(Look look, const char* utf8, double x, doubl
     for (const QString& line : lines) {
         width = qMax(width, metrics.horizontalAdvance(line));
     }
-    // Beside the margin of the document every line has one of its own, which leaves room for the handles.
+    // In addition to the margin of the document every line has a margin, which leaves room for the handles.
     const double margin = TextObjectConstants::MARGIN_SHARE_OF_LINE / 2 * metrics.height();
     const double left = (look.align == LEFT ? x : look.align == CENTRE ? x - width / 2 : x - width) - margin;
     const double top = y + metrics.capHeight() / 2 - metrics.ascent();

@@ -13,7 +13,7 @@ constexpr const char* CHINESE = "DFHeiW5-A";
 constexpr const char* JAPANESE = "KST Japanese Pro";
 constexpr const char* KOREAN = "YDGothic 100 Pro";
 
-// At any size; the pictures are painted at the largest.
+// Returns a function that paints the picture at its full size and scales it to any other.
 std::function<QImage(const QSize&)> scaled(QImage (*paint)())
 {
     return [paint](const QSize& size) {
@@ -96,7 +96,7 @@ SampleTitles::Sample SampleTitles::sample(const char* stem, std::function<QImage
                                           const std::vector<Line>& lines)
 {
     Sample made{stem, std::move(background), Archive()};
-    std::vector<TText*> texts; // owned by the record from here on
+    std::vector<TText*> texts; // owned by the record after setText
     for (const Line& line : lines) {
         texts.push_back(SampleText::make(static_cast<int>(texts.size()) + 1, line.text, line.look).release());
     }

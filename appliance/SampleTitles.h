@@ -1,4 +1,3 @@
-// The records of the sample titles.
 #pragma once
 
 #include "appliance/SampleText.h"
@@ -10,14 +9,16 @@
 #include <string>
 #include <vector>
 
+// Makes the records of the sample titles.
 class SampleTitles
 {
 public:
-    // A title to be written. stem is the name of all its files; the record has its text objects and nothing
-    // else.
+    // A title to be written. stem is the base name of all its files; only the text objects of the record are
+    // set.
     struct Sample {
         std::string stem;
-        std::function<QImage(const QSize&)> background; // paints it at a size; none without a background
+        // paints the background at a size; empty without a background
+        std::function<QImage(const QSize&)> background;
         Archive archive;
     };
 
@@ -35,7 +36,7 @@ public:
 
     static std::vector<Folder> folders();
 
-    // A title with the lines as text objects, numbered from 1.
+    // Returns a title with the lines as text objects, numbered from 1.
     static Sample sample(const char* stem, std::function<QImage(const QSize&)> background,
                          const std::vector<Line>& lines);
 };

@@ -1,4 +1,3 @@
-// Takes the calls of one service off the wire and hands them on by name, with their parameters as JSON.
 #pragma once
 
 #include "appliance/ServiceDescription.h"
@@ -12,18 +11,20 @@ namespace PTC
 class IProxyBase;
 }
 
+// Receives the calls of one service and passes them to a handler, with the name of the method and the
+// parameters as JSON.
 class ServiceAdapter : public PTC::Adapter
 {
 public:
-    // Who takes the calls. proxy is what a registration made, null for other calls and for a client out of
-    // reach.
+    // The receiver of the calls. proxy is the client's proxy for a registration; null for other calls and if
+    // the client cannot be reached.
     using Handler = std::function<void(const ServiceDescription& service, const ServiceMethod& method,
                                        const QJsonObject& args, std::unique_ptr<PTC::IProxyBase> proxy)>;
 
     ServiceAdapter(ServiceDescription service, Handler handler);
 
     void receive(PTC::Event* event) override;
-    // The handler is the target; a pointer has no use here.
+    // Does nothing: the handler is the target.
     void setTarget(void* target) override;
 
 private:

@@ -1,4 +1,3 @@
-// What the services of the appliance take: their methods by id, with the parameters as JSON.
 #pragma once
 
 #include "messaging/services/ServiceCall.h"
@@ -13,18 +12,19 @@ struct ServiceMethod {
     long id;
     const char* name;
     Kind kind;
-    const char* parameter; // name of the parameter, "" without one
-    // Returns the fields of the parameter, or a single value under its name; zero values for bad data.
+    const char* parameter; // name of the parameter; "" if there is none
+    // Returns the fields of the parameter, or a single value under its name. Invalid data gives zero values.
     QJsonObject (*decode)(const char* parameter, void* data, long size);
 };
 
+// Describes the services of the appliance: their methods by id, with the parameters as JSON.
 struct ServiceDescription {
     const char* name;
     long interfaceId;
     long callBackAdapterType;
-    long notifyAdapterType; // 0 for none
+    long notifyAdapterType; // 0 if there is none
     std::vector<ServiceMethod> methods;
 };
 
-// The eight services that a titler calls.
+// Returns the eight services that a titler calls.
 std::vector<ServiceDescription> describeServices();

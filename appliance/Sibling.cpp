@@ -73,7 +73,8 @@ bool Sibling::connectTo(long client)
     return senderTo(client) != nullptr;
 }
 
-// A client that was started anew is reached through the sender that its proxies already hold.
+// The sender of a client is kept, because its proxies hold it; a client that was restarted is reached through
+// it again.
 SocketRemoteSender* Sibling::senderTo(long client)
 {
     const long key = ServiceTable::senderKeyOf(client);

@@ -24,7 +24,7 @@ constexpr int PICTURES_TIMEOUT_MS = 60000;
 constexpr auto TITLES = "resources/Titles";
 constexpr auto TEMPLATES = "resources/Templates";
 
-// Every node that a program of the appliance asks the path file for.
+// All elements that programs of the appliance look up in the path file, with their folders.
 constexpr std::array<std::pair<const char*, const char*>, 20> PATH_NODES{{
     {"Data", "data"},
     {"Resource", "resources"},
@@ -48,7 +48,7 @@ constexpr std::array<std::pair<const char*, const char*>, 20> PATH_NODES{{
     {"tmp", "tmp"},
 }};
 
-// A folder beside the wanted one in which a set is made before it moves there.
+// Returns the temporary folder in which a set is prepared before it is renamed to path.
 QString asideOf(const QString& path)
 {
     return path + QStringLiteral(".making");
@@ -68,8 +68,7 @@ QString TitlerProvision::basePathOfEnvironment()
         return {};
     }
     QString path = QString::fromLocal8Bit(data.data());
-    // The titler reads the two in the same manner: under the root "/" the data path is taken without its
-    // first slash.
+    // As the titler does: if the root path is "/", the data path is used without its leading "/".
     if (k2sys_getenv_ac_root(root.data(), root.size()) == 1) {
         path.remove(0, 1);
         path.prepend(QString::fromLocal8Bit(root.data()));
@@ -133,7 +132,7 @@ bool TitlerProvision::writeTemplateSet(ThumbnailRender& render, const QString& f
     if (QFileInfo::exists(folder)) {
         return true;
     }
-    // The backgrounds of presets are named by absolute paths, so they lie where they stay from the start.
+    // Titles name preset backgrounds by absolute paths, so these are written to their final folder at once.
     const QString backgrounds = mBase + QLatin1String(TEMPLATES) + QStringLiteral("/backgrounds");
     std::vector<SampleTitles::Sample> samples = PresetTemplates::samples(chinese);
     return makeFolder(backgrounds) && writeFolder(render, folder, samples, backgrounds);
@@ -141,7 +140,8 @@ bool TitlerProvision::writeTemplateSet(ThumbnailRender& render, const QString& f
 
 bool TitlerProvision::writeTitles()
 {
-    // The samples are a greeting: once there is a folder of titles, removed ones do not come back.
+    // Samples are only written to a new data path: once the folder of titles exists, deleted samples must not
+    // come back.
     const QString root = mBase + QLatin1String(TITLES);
     if (QFileInfo::exists(root)) {
         return true;
@@ -195,7 +195,7 @@ bool TitlerProvision::writeTitle(ThumbnailRender& render, const QString& folder,
     archive.setThumbnailSmall(stem + "_240.png");
     archive.setThumbnailBlack(stem + "_240S.png");
     if (sample.background) {
-        // A title owns its background; templates share theirs and name it by its whole path.
+        // A title has its own background file; templates share theirs and name it by its absolute path.
         const bool own = backgroundFolder.isEmpty();
         const QString where = (own ? folder : backgroundFolder) + QLatin1Char('/');
         const QString name = QString::fromStdString(stem) + QStringLiteral("_source_%1.png");

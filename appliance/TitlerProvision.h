@@ -1,9 +1,3 @@
-// Fills the data path that a titler without an appliance around it works on: the path file, the checker
-// pictures, preset templates and folders of sample titles with their pictures.
-//
-// Only what is missing is written; what is there, the user's changes included, stays as it is. Sets of titles
-// are made aside and moved into place when they are whole, so an interrupted run leaves nothing half done.
-// GUI thread only: the pictures are laid out with text items. Needs a QApplication.
 #pragma once
 
 #include "appliance/SampleTitles.h"
@@ -13,17 +7,23 @@
 
 class ThumbnailRender;
 
+// Fills the data path for a titler that runs without an appliance: the path file, the checker pictures,
+// preset templates and folders of sample titles with their pictures.
+//
+// Only missing files are written; existing ones, including the user's changes, stay unchanged. Sets of titles
+// are prepared in a temporary folder and renamed when they are complete, so an interrupted run leaves no
+// incomplete set. GUI thread only, because the pictures are laid out with text items. Needs a QApplication.
 class TitlerProvision
 {
 public:
-    // basePath ends with "/": the folder that the paths in the path file are relative to. It has to be that
-    // of the environment, where the reduction of pictures looks for its checker.
+    // basePath ends with "/" and is the folder that the paths in the path file are relative to. It must be
+    // that of the environment, because the reduction of pictures looks there for the checker picture.
     explicit TitlerProvision(QString basePath);
 
-    // The base path that the platform library names; empty when it names none.
+    // Returns the base path of the platform library, or an empty string if there is none.
     static QString basePathOfEnvironment();
 
-    // True when all is there in the end; error() tells what failed otherwise.
+    // Returns whether everything is present afterwards; otherwise error() returns the reason.
     bool writeMissing();
     QString error() const { return mError; }
 

@@ -1,5 +1,5 @@
-// The appliance around a titler as one program without a window: both sibling processes, driven by lines on
-// standard input, with one line of JSON on standard output for every event.
+// Runs the appliance around a titler as one program without a window: both sibling processes are controlled
+// by lines on standard input and write one line of JSON to standard output for every event.
 #include "appliance/Appliance.h"
 #include "appliance/CommandInterpreter.h"
 #include "appliance/LineReader.h"

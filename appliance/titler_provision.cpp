@@ -1,6 +1,6 @@
-// titler_provision: fills the data path of the environment with what a titler needs and some sample titles.
-// Prints the base path that it filled. Ends 1 when something could not be written, 2 when the data path
-// cannot be worked with.
+// titler_provision: fills the data path of the environment with the files that a titler needs and some sample
+// titles. Prints the base path. Exits with 1 if something could not be written, with 2 if the data path is
+// not usable.
 
 #include "appliance/TitlerProvision.h"
 #include "support/DataPathCheck.h"
@@ -15,7 +15,7 @@
 int main(int argc, char* argv[])
 {
     OwnerOnlyFiles::setUmask();
-    // Pictures are the same without a display, and there need not be one.
+    // The pictures do not depend on a display, and there may be none.
     qputenv("QT_QPA_PLATFORM", "offscreen");
     const QApplication application(argc, argv);
     QTextStream out(stdout);

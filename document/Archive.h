@@ -1,6 +1,3 @@
-// One title in memory: where it lies on disk, its pictures, its background and its text objects.
-// Strings are UTF-8. Whoever makes an Archive owns it; a copy is deep. Not locked: a worker gets its own
-// copy.
 #pragma once
 
 #include <QString>
@@ -10,6 +7,9 @@
 
 class TText;
 
+// Holds one title in memory: its path, its pictures, its background and its text objects. Strings are UTF-8.
+// The creator of an Archive owns it; a copy is deep. Not synchronised: a worker thread gets a copy of its
+// own.
 class Archive
 {
 public:
@@ -35,8 +35,8 @@ public:
     std::string getCategory() const { return mCategory; }
     void setCategory(std::string category) { mCategory = std::move(category); }
 
-    // Picture file names beside the title file: 240, 240 on black, 1920 and 960 pixels wide. The small one
-    // may be an absolute path.
+    // Picture file names beside the title file: 240 pixels wide, 240 on black, 1920 and 960 pixels wide. The
+    // small one may be an absolute path.
     std::string getThumbnailSmall() const { return mThumbnailSmall; }
     void setThumbnailSmall(std::string name) { mThumbnailSmall = std::move(name); }
     std::string getThumbnailBlack() const { return mThumbnailBlack; }
@@ -52,7 +52,7 @@ public:
     std::string getBgResourceBig() const { return mBgResourceBig; }
     void setBgResourceBig(std::string name) { mBgResourceBig = std::move(name); }
 
-    // Key parameters, carried as text.
+    // Parameters of the keyer, stored as text.
     std::string getClip() const { return mClip; }
     void setClip(std::string clip) { mClip = std::move(clip); }
     std::string getGain() const { return mGain; }
@@ -60,7 +60,8 @@ public:
     std::string getDensity() const { return mDensity; }
     void setDensity(std::string density) { mDensity = std::move(density); }
 
-    // Place of the background on the 1280 x 720 canvas, and its stacking value below the text objects.
+    // Position of the background on the 1280 x 720 canvas, and its z value, which is below those of the text
+    // objects.
     float getBgPointX() const { return mBgPointX; }
     void setBgPointX(float x) { mBgPointX = x; }
     float getBgPointY() const { return mBgPointY; }
@@ -68,27 +69,27 @@ public:
     float getBgPointZ() const { return mBgPointZ; }
     void setBgPointZ(float z) { mBgPointZ = z; }
 
-    // A copy of the vector; the text objects stay owned by this record.
+    // Returns a copy of the vector; this record keeps ownership of the text objects.
     std::vector<TText*> getText() const { return mText; }
 
-    // Takes the text objects over. Those held before are NOT freed: call releaseVectorText() first to replace
-    // them.
+    // Takes ownership of the text objects. Does NOT delete the previous ones: call releaseVectorText() first
+    // to replace them.
     void setText(std::vector<TText*> text) { mText = std::move(text); }
 
-    // The same text objects without a copy of the vector; valid until they are replaced.
+    // Returns the same text objects without copying the vector; valid until they are replaced.
     const std::vector<TText*>& text() const { return mText; }
 
     // Deletes all text objects.
     void releaseVectorText();
 
-    // Whether the background lies outside the title's folder.
+    // Returns whether the background is outside the title's folder.
     bool isPreset() const;
 
-    // Full paths; null for a picture that the title does not have, and for one that lies where no titles and
-    // templates are (see ConfinedPath).
+    // Return full paths. Null if the title does not have the picture, or if it is outside the folders that a
+    // title may refer to (see ConfinedPath).
     QString getFullPathOfThumbnailSmall() const;
     QString getFullPathOfBgResource() const;
-    QString getFullPathOfBgResourceBig() const; // taken as absolute when the 1280 wide background is
+    QString getFullPathOfBgResourceBig() const; // absolute if the 1280 wide background is
 
 private:
     void cloneText(const std::vector<TText*>& text);

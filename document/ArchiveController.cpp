@@ -36,7 +36,8 @@ QString toQString(const std::string& text)
     return QString::fromLocal8Bit(text.data(), static_cast<qsizetype>(text.size()));
 }
 
-// Empty for a name that leads to where no titles and templates are.
+// Returns the path of a file beside the title; empty if it leads outside the folders that a title may refer
+// to.
 std::string beside(const Archive& archive, const std::string& name)
 {
     const std::string path = archive.getPath();
@@ -44,7 +45,7 @@ std::string beside(const Archive& archive, const std::string& name)
     return ConfinedPath::namedByTitle(folder, folder + '/' + name);
 }
 
-// The number of a row "UserTemplate_NNN/Titler.xml"; 0 for any other.
+// Returns the number of a row "UserTemplate_NNN/Titler.xml", or 0 for any other row.
 int userTemplateNumber(const std::string& rowPath)
 {
     if (!rowPath.starts_with(USER_TEMPLATE_PREFIX))
@@ -57,7 +58,8 @@ int userTemplateNumber(const std::string& rowPath)
     return isNumber && number > 0 ? number : 0;
 }
 
-// The first number from 1 on that is not in the list, as long as the list has no number twice; 0 for none.
+// Returns the smallest positive number that is not in the list, or 0 if there is no gap. Expects no
+// duplicates.
 int firstGap(std::vector<int> numbers)
 {
     std::sort(numbers.begin(), numbers.end());
@@ -68,7 +70,8 @@ int firstGap(std::vector<int> numbers)
     return 0;
 }
 
-// A source that is not there is none: titles lack pictures, and get them when they are opened.
+// Copies the file; succeeds without copying if the source does not exist. Titles may lack pictures, which are
+// generated when the title is opened.
 bool copyIfThere(const std::string& source, const std::string& target)
 {
     struct stat status = {};
@@ -81,13 +84,13 @@ bool copyIfThere(const std::string& source, const std::string& target)
     return SystemInfo::copyFolderFile(source, target);
 }
 
-// Inserts the old rows that are not known, each behind the row that it stood behind. Returns whether there
-// were any.
+// Inserts those old rows that are missing in rows and not in known, each behind its previous neighbour, if
+// their files exist. Returns whether there were any.
 bool insertUnknownRows(const std::string& folder, const std::vector<ArchiveOrder>& oldRows,
                        const std::unordered_set<std::string>& known, std::vector<ArchiveOrder>& rows)
 {
     std::unordered_map<std::string, std::vector<ArchiveOrder>>
-        unknownBehind; // by the row before; "" at the top
+        unknownBehind; // key: the row before; "" for rows at the top
     std::string before;
     std::unordered_set<std::string> listed;
     for (const ArchiveOrder& row : rows)
@@ -132,8 +135,8 @@ QList<std::string> ArchiveController::getFolderList()
     return QList<std::string>(folders.begin(), folders.end());
 }
 
-// Row by row, without those that are too short for the name of a title. The others must not be lost with
-// them: what the list does not show, the clean-up deletes.
+// Returns all titles of the list that can be read. A row that cannot be a title is skipped alone: if the
+// others were lost with it, the clean-up would delete their files.
 QList<Archive*> ArchiveController::getArchiveList(QString folder)
 {
     const FolderTitles rows(folder.toStdString(), FolderTitles::WithoutOrder::ByName);
@@ -189,7 +192,7 @@ bool ArchiveController::prepareOrder(QString folder)
     if (state == FolderOrder::State::Whole)
         return !FolderOrder::isKept(path);
     if (state == FolderOrder::State::Unreadable)
-        return false; // it may be good, and must not be written over
+        return false; // it may be intact, so do not overwrite it
     const std::vector<ArchiveOrder> rows =
         FolderOrder::rowsByName(mArchiveManager->getFileListUnderFolder(path));
     if (rows.empty())
@@ -256,7 +259,7 @@ int ArchiveController::copyArchiveThumbnail(Archive* from, Archive* to)
     const auto copy = [&](std::string (Archive::*name)() const) {
         const std::string source = (from->*name)();
         const std::string target = (to->*name)();
-        if (!source.empty() && !target.empty()) // an empty name would stand for the whole folder
+        if (!source.empty() && !target.empty()) // with an empty name the path would be the folder
             isCopied = copyIfThere(beside(*from, source), beside(*to, target)) && isCopied;
     };
     copy(&Archive::getThumbnailBig);
@@ -320,7 +323,7 @@ void ArchiveController::deleteUnusefulArchives(QString folder)
     if (FolderOrder::read(path, rows) != FolderOrder::State::Whole || FolderOrder::isKept(path))
         return;
     if (!rows.empty()) {
-        if (victims.size() - 1 == rows.size()) // one of the files is the order file
+        if (victims.size() - 1 == rows.size()) // the order file is counted, too
             return;
         std::vector<std::string> targets;
         for (const ArchiveOrder& row : rows)

@@ -1,6 +1,3 @@
-// Title storage as the widgets use it: QString instead of bytes, and what ArchiveManager lacks: copies of
-// pictures, free names, new order files, and the removal of titles that no order file names. A cheap object;
-// each user holds its own, on any thread.
 #pragma once
 
 #include <QList>
@@ -14,6 +11,9 @@ class Archive;
 class ArchiveManager;
 class ArchiveOrder;
 
+// Provides the widgets with title storage in terms of QString. Adds to ArchiveManager the copying of
+// pictures, free names, new order files, and the removal of titles that no order file lists. Cheap to
+// construct: each user constructs its own, in any thread.
 class ArchiveController
 {
 public:
@@ -22,13 +22,13 @@ public:
     ArchiveController(const ArchiveController&) = delete;
     ArchiveController& operator=(const ArchiveController&) = delete;
 
-    // Full paths of the title folders.
+    // Returns the full paths of the title folders.
     QList<std::string> getFolderList();
 
-    // The titles of a folder in its order, or by name where it has none. The caller owns them.
+    // Returns the titles of a folder in its order, or by name if it has no order file. The caller owns them.
     QList<Archive*> getArchiveList(QString folder);
 
-    // Reads one title into the record.
+    // Reads one title into the record. Returns false if it cannot be read.
     bool getOneArchive(QString path, Archive* archive);
 
     // Writes the title to the path in its record; path is only tested for being empty.
@@ -36,21 +36,21 @@ public:
     bool deleteArchive(QString path);
     bool saveArchiveListOrder(QString folder, QList<ArchiveOrder*> rows);
 
-    // Looks at the order of a folder that is being opened: where it is missing or torn, a new one is made of
-    // the names of its titles (what the disk refuses is kept). Returns whether the order can be trusted: it
-    // is whole, or there was nothing to put in order. Where it cannot, nothing may be removed because the
-    // order does not name it.
+    // Checks the order file of a folder that is being opened. If it is missing or damaged, a new one is made
+    // with the titles sorted by name (if it cannot be written it is kept, see RefusedWrites). Returns whether
+    // the order is reliable: it was complete, or the folder has no titles. If it is not reliable, titles that
+    // it does not list must not be removed.
     bool prepareOrder(QString folder);
 
-    // Saves the order of the titles that are listed. Rows of the old order for files that are in the folder
-    // but are not known, because they could not be read, keep their place. What the disk refuses is kept, too
-    // (RefusedWrites). Returns whether the order is on its way to the disk and can be trusted: where the old
-    // one could not be read there may have been titles that it did not name.
+    // Saves the order of the listed titles. Rows of the old order that are not in known, because their titles
+    // could not be read, keep their place if their files exist. If the write fails the order is kept
+    // (RefusedWrites). Returns whether the order was written and is reliable; it is not if the old order was
+    // unreadable and unknown titles exist.
     bool saveListedOrder(QString folder, QList<ArchiveOrder*> listed,
                          const std::unordered_set<std::string>& known);
 
-    // The rows of a folder's order file. They stay valid as long as this controller, however often it is
-    // asked.
+    // Returns the rows of a folder's order file. They remain valid until this controller is destroyed, also
+    // after further calls.
     std::vector<ArchiveOrder*> getFileOrder(QString folder);
 
     QString getLastArchivePath();
@@ -58,33 +58,34 @@ public:
     QString getLastFolderPath();
     int setLastFolderPath(QString path);
 
-    // Copy pictures between the folders of two titles, from the names in one record to those in the other. 0
-    // when a file that is there could not be copied, else 1.
+    // Copy the pictures of one title to the folder of another, under the names in the other's record. Return
+    // 0 if an existing file could not be copied, else 1.
     int copyArchiveBg(Archive* from, Archive* to);
     int copyArchiveThumbnail(Archive* from, Archive* to);
 
-    // "UserTemplate_" and the three digits of a free number; empty when there is none.
+    // Returns "UserTemplate_" and a free number of three digits, or an empty string if there is none.
     QString getFreeNameInUserTemplate(QString folder);
 
-    // Makes an order file for a folder that has XML files but no rows. Whether it did.
+    // Creates an order file for a folder that has XML files but no rows. Returns whether it was created.
     bool createNewOrderAccordingToFilesUnderFolder(QString folder);
 
-    // The same for all title folders; gives those that got a new order file.
+    // Calls createNewOrderAccordingToFilesUnderFolder for all title folders; returns those that got a new
+    // order file.
     QList<std::string> reCreateOrderXml();
 
-    // Deletes the titles of a folder, with their pictures, that its order file does not name, and reports
-    // each. Looks at the names only when there are more or fewer files than rows. Does nothing without a
-    // whole order file, or with one that the disk has not taken yet.
+    // Deletes, with their pictures, the titles of a folder that its order file does not list, and reports
+    // each deletion. Compares names only if the numbers of files and rows differ. Does nothing if the order
+    // file is incomplete or not written yet.
     void deleteUnusefulArchives(QString folder);
 
     std::vector<std::string> getTargetFileList(std::vector<ArchiveOrder*> rows, std::string folder);
 
-    // The title files that are no targets.
+    // Returns the title files that are not among the targets.
     std::vector<std::string> getDeletedFileList(std::vector<std::string> files,
                                                 std::vector<std::string> targets);
 
 private:
     ArchiveManager* mArchiveManager;       // shared, not owned
-    std::vector<ArchiveOrder*> mFileOrder; // the rows last fetched
+    std::vector<ArchiveOrder*> mFileOrder; // the result of the last getFileOrder()
     std::vector<std::unique_ptr<ArchiveOrder>> mFetchedRows;
 };

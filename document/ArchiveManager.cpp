@@ -25,7 +25,7 @@ namespace
 std::mutex gInstanceMutex;
 std::mutex gRootMutex;
 
-// What stands behind the last "/"; the whole path when it has none.
+// Returns the part behind the last "/", or the whole path if there is none.
 std::string fileNameOf(const std::string& path)
 {
     const std::size_t slash = path.rfind('/');
@@ -142,14 +142,15 @@ int ArchiveManager::loadArchive(std::string path, Archive* archive)
 int ArchiveManager::deleteArchive(std::string path)
 {
     Archive archive;
-    if (TitleParser().readOneTitle(path, &archive) < 1) // its place in the order does not matter
+    // the return value 1 or higher; the position does not matter
+    if (TitleParser().readOneTitle(path, &archive) < 1)
         return 0;
     const bool isRemoved = std::remove(path.c_str()) == 0;
     if (!isRemoved)
-        return 0; // it keeps its pictures
+        return 0; // keep its pictures as well
     RefusedWrites::forget(path);
     const std::string folder = path.substr(0, path.rfind('/') + 1);
-    // Most titles lack some of these.
+    // Errors are ignored: most titles lack some of these pictures.
     for (const std::string& name :
          {archive.getThumbnailBig(), archive.getThumbnailSmall(), archive.getThumbnailMiddle(),
           archive.getThumbnailBlack(), archive.getBgResource(), archive.getBgResourceBig()}) {
@@ -177,14 +178,14 @@ int ArchiveManager::checkFilesUnderFolder(std::string folder)
 bool ArchiveManager::isTitleFile(const std::string& path)
 {
     const QFileInfo file(QString::fromStdString(path));
-    // An order with a name that is not UTF-8 could not be read again, and would hide all the others.
+    // A name that is not UTF-8 would make the order file unreadable, which would hide all other titles.
     return Utf8::isValid(path) && file.suffix().compare(QLatin1String("xml"), Qt::CaseInsensitive) == 0 &&
            file.fileName().compare(QLatin1String(TitleParser::ORDER_FILEPATH), Qt::CaseInsensitive) != 0;
 }
 
 bool ArchiveManager::isPictureName(const std::string& name)
 {
-    // The system's calls would end a name at a NUL.
+    // System calls would treat a NUL as the end of the name.
     return !name.empty() && name.find('/') == std::string::npos && name.find('\0') == std::string::npos &&
            QFileInfo(QString::fromStdString(name))
                    .suffix()

@@ -1,9 +1,9 @@
-// Titles as files, through TitleParser. Shared without a lock between threads: its only state is the path of
-// the title root, which is looked up under a lock of its own.
 #pragma once
 
 #include "document/IArchiveManager.h"
 
+// Stores titles as files by means of TitleParser. Shared between threads without a lock: its only state is
+// the path of the title root, which has a lock of its own.
 class ArchiveManager : public IArchiveManager
 {
 public:
@@ -11,7 +11,8 @@ public:
     static constexpr char TEMP_LASTARCHIVE[] = "lastarchive";
     static constexpr char TEMP_PATH[] = "path";
 
-    // The shared instance, made on first use; cleanUp deletes it. Private ones may be made beside it.
+    // Returns the shared instance, which is created on first use; cleanUp deletes it. Further instances may
+    // be created.
     static ArchiveManager* getInstance();
     static void cleanUp();
 
@@ -38,17 +39,18 @@ public:
     // Saves to the path in the record.
     int saveArchive(Archive* archive);
 
-    // Makes a new order file when a title of the folder has no file. 1 when it did.
+    // If a title listed for the folder has no file, writes a new order file and returns 1; otherwise returns
+    // 0.
     int checkFilesUnderFolder(std::string folder);
 
-    // Whether a path is that of an XML file other than the order file, whatever the case of its letters. A
-    // name that is not UTF-8 is none: such a file is neither shown nor cleaned up.
+    // Returns whether path is an XML file other than the order file, ignoring case. False for a name that is
+    // not UTF-8: such a file is neither shown nor cleaned up.
     static bool isTitleFile(const std::string& path);
 
-    // Whether a name in a title file may be that of a picture beside it. A title file of foreign making must
-    // not choose what else is written over or removed, so names that lead to another folder and those of XML
-    // files are none, and the empty one is none either. A preset's background lies elsewhere and so is none.
-    // Any thread.
+    // Returns whether a name in a title file can be a picture beside it. An untrusted title file must not
+    // decide which other files are overwritten or removed. Therefore false for an empty name, for names that
+    // lead to another folder, and for XML files; also for the background of a preset, which is in another
+    // folder. Any thread.
     static bool isPictureName(const std::string& name);
 
 private:

@@ -1,5 +1,3 @@
-// Storage as the canvas uses it: saves a title and loads the last text style. A cheap object; saves may run
-// on a worker thread that has one of its own.
 #pragma once
 
 #include "document/SettingManager.h"
@@ -10,16 +8,18 @@ class Archive;
 class ArchiveManager;
 class FontStyle;
 
+// Provides the canvas with storage: saves a title and loads the last text style. Cheap to construct: a worker
+// thread that saves constructs its own.
 class CanvasController
 {
 public:
     CanvasController();
 
-    // Writes the title to the path in its record. What the disk refuses is kept and written when the disk
-    // takes it (RefusedWrites). Returns whether the file is written; an empty path does nothing.
+    // Writes the title to the path in its record. If the write fails, the title is kept and written later
+    // (RefusedWrites). Returns whether it was written; does nothing if path is empty.
     bool saveArchiveChange(QString path, Archive* archive);
 
-    // 1 when the style was read; 0 leaves it as it was.
+    // Returns 1 if the style was read; 0 leaves style unchanged.
     int getTextStyle(FontStyle* style);
 
 private:

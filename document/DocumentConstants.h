@@ -1,5 +1,5 @@
-// Defaults and fixed words of the title records and their files. Each source unit has its own copy of the
-// strings, so that they are ready before any static object of that unit uses them.
+// Defaults and fixed strings of the title records and their files. Each translation unit has its own copy of
+// the strings, so that they are initialised before any static object of that unit uses them.
 #pragma once
 
 #include <string>

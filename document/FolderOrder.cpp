@@ -16,7 +16,7 @@
 namespace
 {
 
-// Leading blanks and what follows the number do not matter.
+// Accepts leading blanks and any text behind the number.
 bool readInt(const TiXmlElement& element, const char* key, int& value)
 {
     return element.QueryIntAttribute(key, &value) == TIXML_SUCCESS;
@@ -100,7 +100,7 @@ std::string FolderOrder::toBytes(const std::vector<ArchiveOrder>& rows)
 {
     TiXmlDocument document;
     document.LinkEndChild(new TiXmlDeclaration(XML_VERSION, XML_ENCODING, STR_EMPTY));
-    auto* root = new TiXmlElement(TitleParser::ORDER_NODE_ROOT); // linked elements belong to the document
+    auto* root = new TiXmlElement(TitleParser::ORDER_NODE_ROOT); // the document owns linked elements
     root->SetAttribute(TitleParser::ORDER_TYPE, TitleParser::ORDER_TYPE_VAL);
     root->SetAttribute(TitleParser::ORDER_INDEX_COUNT, static_cast<int>(rows.size()));
     document.LinkEndChild(root);

@@ -1,8 +1,3 @@
-// The order file of a folder: which titles it shows, and in which order. Replaced as a whole, so that a
-// reader finds the old rows or the new ones.
-//
-// A whole order file is taken at its word: what it does not name is not shown. Where there is none, or none
-// that can be read, every title file of the folder is shown, by its name. Any thread.
 #pragma once
 
 #include "document/ArchiveOrder.h"
@@ -10,34 +5,39 @@
 #include <string>
 #include <vector>
 
+// The order file of a folder: which titles it shows, and in which order. It is replaced as a whole, so that a
+// reader gets either the old rows or the new ones.
+//
+// If the order file is complete, only the titles it lists are shown. If it is missing or cannot be read, all
+// title files of the folder are shown, sorted by name. Any thread.
 class FolderOrder
 {
 public:
     enum class State {
         Whole,
         Missing,
-        Torn,       // there are bytes, but they are no order
-        Unreadable, // the disk does not give them now; they may be good
+        Torn,       // the file is not a valid order file
+        Unreadable, // a read error; the file may be intact
     };
 
-    // Reads the rows in document order; none unless the state is Whole. A row without a number is passed
-    // over.
+    // Reads the rows in document order; rows is empty unless the result is Whole. Skips rows without a
+    // number.
     static State read(const std::string& folder, std::vector<ArchiveOrder>& rows);
     static State stateOf(const std::string& folder);
 
-    // The rows, or else one for each title file, by name.
+    // Returns the rows; if they cannot be read, one row for each title file, sorted by name.
     static std::vector<ArchiveOrder> rowsToShow(const std::string& folder);
 
-    // One row for each title file among these, by name.
+    // Returns one row for each title file among these, sorted by name.
     static std::vector<ArchiveOrder> rowsByName(const std::vector<std::string>& files);
 
-    // Replaces the order file. On false, with errno, the old one is still there.
+    // Replaces the order file. Returns false, with errno set and the old file unchanged, on failure.
     static bool write(const std::string& folder, const std::vector<ArchiveOrder>& rows);
 
-    // As write; rows that the disk refuses are kept, and written when it takes them (RefusedWrites).
+    // As write; on failure the rows are kept and written later (RefusedWrites).
     static bool writeOrKeep(const std::string& folder, const std::vector<ArchiveOrder>& rows);
 
-    // Whether rows of this folder are kept that the disk has refused.
+    // Returns whether rows of this folder could not be written yet and are kept.
     static bool isKept(const std::string& folder);
 
 private:

@@ -17,7 +17,8 @@ namespace
 
 constexpr std::size_t EXTENSION_LENGTH = 4; // of ".xml"
 
-// Calls job(0) to job(count - 1), each once, and returns when all are done. The calling thread takes part.
+// Calls job(0) to job(count - 1), each once, and returns when all are done. The calling thread runs jobs,
+// too.
 template <typename Job>
 void onAllCores(std::size_t count, const Job& job)
 {

@@ -1,5 +1,3 @@
-// The titles of a folder as its order file lists them, for those who need a few of many titles. The rows are
-// read when the object is made, a title each time it is asked for. Never changes, so any thread may read.
 #pragma once
 
 #include <cstddef>
@@ -9,28 +7,30 @@
 
 class Archive;
 
+// Reads the titles of a folder in the order of its order file, for users that need only a few of many titles.
+// The rows are read by the constructor, each title when it is requested. Immutable, so any thread may read.
 class FolderTitles
 {
 public:
-    // What a folder shows whose order file is missing or cannot be read.
+    // Selects what to show if the order file is missing or cannot be read.
     enum class WithoutOrder { Nothing, ByName };
 
     // An empty path gives no rows.
     explicit FolderTitles(std::string folder, WithoutOrder withoutOrder = WithoutOrder::Nothing);
 
     std::size_t count() const { return mNames.size(); }
-    // Name of the title file relative to the folder; empty for a blank row.
+    // Returns the name of the title file relative to the folder; empty for a row without a name.
     const std::string& fileName(std::size_t row) const { return mNames[row]; }
-    // Full path of the title file; empty for a blank row.
+    // Returns the full path of the title file; empty for a row without a name.
     std::string path(std::size_t row) const;
-    // False for a name that is too short for that of a title file.
+    // Returns false if the name is too short for a title file.
     bool canBeTitle(std::size_t row) const;
 
-    // Returns the title with its name and its place in the order. Null when the file is missing or
-    // unreadable. A blank row gives an empty title.
+    // Returns the title with its name and its position in the order. Null if the file is missing or
+    // unreadable. A row without a name gives an empty title.
     std::unique_ptr<Archive> read(std::size_t row) const;
-    // The same for count rows from the first one on, which must exist. Uses all cores; the calling thread
-    // takes part.
+    // Reads count rows beginning with first, all of which must exist. Uses all cores, including the calling
+    // thread.
     std::vector<std::unique_ptr<Archive>> read(std::size_t first, std::size_t count) const;
 
 private:

@@ -1,5 +1,3 @@
-// The flat text style that the property panel remembers between objects. It is kept in the settings, not in a
-// title. Strings are UTF-8, colours "#rrggbb". A copy shares nothing with its source.
 #pragma once
 
 #include "document/TEdge.h"
@@ -8,6 +6,8 @@
 #include <string>
 #include <utility>
 
+// The flat text style that the property panel remembers between objects. It is stored in the settings, not in
+// a title. Strings are UTF-8, colours "#rrggbb". A copy is independent of its source.
 class FontStyle
 {
 public:
@@ -32,12 +32,12 @@ public:
     const std::string& getColor() const { return mColor; }
     void setColor(const std::string& color) { mColor = color; }
 
-    // Never null, stays owned by this record, and is there to be changed in place.
+    // Never null. Owned by this record; may be changed in place.
     TEdge* getEdgePoint() { return &mEdgePoint; }
     const TEdge* getEdgePoint() const { return &mEdgePoint; }
     void setEdgePoint(TEdge edge) { mEdgePoint = std::move(edge); }
 
-    // Never null, stays owned by this record, and is there to be changed in place.
+    // Never null. Owned by this record; may be changed in place.
     TShadow* getShadowPoint() { return &mShadowPoint; }
     const TShadow* getShadowPoint() const { return &mShadowPoint; }
     void setShadowPoint(TShadow shadow) { mShadowPoint = std::move(shadow); }

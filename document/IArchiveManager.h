@@ -1,6 +1,3 @@
-// File-level service for titles. Strings are UTF-8. Results are 1 for done and 0 for refused, -1 where it was
-// the disk that refused to write, with errno; the caller owns
-// the records of a returned vector.
 #pragma once
 
 #include "document/KeyDefine.h"
@@ -11,13 +8,16 @@
 class Archive;
 class ArchiveOrder;
 
+// Reads and writes titles as files. Strings are UTF-8. Results are 1 for success, 0 for invalid arguments or
+// data, and -1, with errno, if the disk refused to write. The caller owns the records of a returned vector.
 class IArchiveManager
 {
 public:
-    // Full paths of the title folders: the direct sub-folders of the title root.
+    // Returns the full paths of the title folders, which are the direct sub-folders of the title root.
     virtual std::vector<std::string> getArchiveFolderList() = 0;
 
-    // The titles of all folders, of one folder in the order of its order file, and the XML files of a folder.
+    // Return the titles of all folders, the titles of one folder in the order of its order file, and the XML
+    // files of a folder, respectively.
     virtual std::vector<Archive*> getAllArchives() = 0;
     virtual std::vector<Archive*> getArchivesUnderFolder(std::string folder) = 0;
     virtual std::vector<std::string> getFileListUnderFolder(std::string folder) = 0;
@@ -28,19 +28,19 @@ public:
     // Writes the file that the record names; path is only tested for being empty.
     virtual int saveArchive(std::string path, Archive* archive) = 0;
 
-    // Reads the title and sets its order, which also happens when the read failed. The name is not set.
+    // Reads the title and sets its order, even if reading failed. Does not set the name.
     virtual int loadArchive(std::string path, Archive* archive) = 0;
 
-    // Removes a title that can be read, with the pictures beside it; the order file is left to the caller.
+    // Removes a readable title with the pictures beside it. The caller updates the order file.
     virtual int deleteArchive(std::string path) = 0;
 
-    // Remembered paths; empty when there is none.
+    // The remembered paths; empty if there is none.
     virtual std::string loadLastArchive() = 0;
     virtual int saveLastArchive(std::string path) = 0;
     virtual std::string loadLastFolder() = 0;
     virtual int saveLastFolder(std::string path) = 0;
 
-    // Change one key parameter of a title file in place.
+    // Change one keyer parameter of a title file in place.
     virtual int modifyClip(std::string path, std::string value) = 0;
     virtual int modifyGain(std::string path, std::string value) = 0;
     virtual int modifyDensity(std::string path, std::string value) = 0;
@@ -48,7 +48,7 @@ public:
 
     virtual std::string getTitleRootFolderPath() = 0;
 
-    // Writes an order file that names the XML files of the folder by name.
+    // Writes an order file that lists the XML files of the folder sorted by name.
     virtual int createNewOrderXML(std::string folder) = 0;
 
     virtual ~IArchiveManager() {}

@@ -1,5 +1,3 @@
-// A set of templates from which new titles start, and the one that was taken last. Strings are UTF-8. GUI
-// thread.
 #pragma once
 
 #include <string>
@@ -7,20 +5,22 @@
 
 class Archive;
 
-// Of the preset designs. Any value other than that for English stands for Chinese.
+// Language of the preset designs. All values other than TEMPLATE_LANGUAGE_EN select Chinese.
 enum emTemplateLanguage { TEMPLATE_LANGUAGE_EN = 0, TEMPLATE_LANGUAGE_CHS = 1 };
 
+// A set of templates from which new titles are made, and the template that was used last. Strings are UTF-8.
+// GUI thread.
 class ITemplateManager
 {
 public:
-    // The templates in the order of their order file; those that cannot be read are left out. The caller owns
-    // them.
+    // Returns the templates in the order of their order file, without those that cannot be read. The caller
+    // owns them.
     virtual std::vector<Archive*> getTemplates(emTemplateLanguage language) = 0;
 
-    // Path of the title file of the template that was taken last; empty when there is none.
+    // Returns the path of the title file of the template that was used last; empty if there is none.
     virtual std::string loadLastTemplatePath() = 0;
 
-    // 1 when it was saved; 0 otherwise, as where the set is read-only.
+    // Returns 1 if the path was saved; 0 otherwise, for example if the set is read-only.
     virtual int saveLastTemplatePath(std::string path) = 0;
 
     virtual ~ITemplateManager() = default;

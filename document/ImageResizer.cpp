@@ -33,7 +33,8 @@ QImage loadImage(const std::wstring& path)
     return PictureReader::read(QString::fromStdWString(path));
 }
 
-// The reduction works on colour bytes, and a palette cannot be painted on.
+// Converts to 32 bits per pixel: the reduction works on colour bytes, and QPainter cannot paint on a palette
+// image.
 QImage with32Bits(const QImage& image)
 {
     if (image.isNull() || image.format() == QImage::Format_RGB32 || image.format() == QImage::Format_ARGB32)
@@ -41,8 +42,8 @@ QImage with32Bits(const QImage& image)
     return image.convertToFormat(image.hasAlphaChannel() ? QImage::Format_ARGB32 : QImage::Format_RGB32);
 }
 
-// The checker picture. One that is there and cannot be read just now is as it was before: a picture that is
-// not made for it would not be made later either.
+// Reads the checker picture. If it exists but cannot be read at the moment, returns the last one that was
+// read, because the small picture of this save is not generated again later.
 QImage readChecker(const QString& path)
 {
     static QString lastPath;
@@ -118,7 +119,7 @@ void ImageResizer::scaledToQuaterSizeWithAAF(QImage& source, QImage& target)
                 sums[i % 4] += first[i] + second[i];
             first += REDUCTION * 4;
             second += REDUCTION * 4;
-            // Blue, green, red, alpha as they lie in memory.
+            // The bytes in memory are blue, green, red, alpha.
             out[column] = qRgba(static_cast<int>(sums[2] >> 3), static_cast<int>(sums[1] >> 3),
                                 static_cast<int>(sums[0] >> 3), static_cast<int>(sums[3] >> 3));
         }
@@ -137,7 +138,7 @@ bool ImageResizer::resizeImageToThumbnailTitlerWithNotAlpha(const std::wstring& 
 
 bool ImageResizer::resizeImageToThumbnailImageWithAlpha(const std::wstring& path, const QImage& reduced)
 {
-    // Drops the alpha and keeps the colours: what was transparent shows the colour stored there.
+    // Drops the alpha channel but not the colours: transparent pixels show their stored colour.
     return save(reduced.convertToFormat(QImage::Format_RGB32), path);
 }
 

@@ -1,6 +1,6 @@
-// Names of the key parameters of a title.
 #pragma once
 
+// Names of the keyer parameters of a title.
 namespace KeyDefine
 {
 

@@ -30,7 +30,7 @@ bool LastSettingParser::createTempFile(const std::string& element, const std::st
 {
     TiXmlDocument document;
     document.LinkEndChild(new TiXmlDeclaration(XML_VERSION, XML_ENCODING, STR_EMPTY));
-    auto* root = new TiXmlElement(TEMP_ROOT); // linked elements belong to the document
+    auto* root = new TiXmlElement(TEMP_ROOT); // the document owns linked elements
     root->SetAttribute(TEMP_TYPE, TEMP_TYPE_VAL);
     document.LinkEndChild(root);
     auto* entry = new TiXmlElement(element);
@@ -57,7 +57,8 @@ bool LastSettingParser::editTempFile(const std::string& element, const std::stri
     return save(document);
 }
 
-// Without it the next session begins elsewhere: nothing that an operator must know of.
+// Failures are logged but not shown to the operator: they only mean that the next session starts with another
+// title.
 bool LastSettingParser::save(const TiXmlDocument& document)
 {
     if (mFilePath.empty() || XmlFile::save(document, mFilePath))

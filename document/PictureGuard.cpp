@@ -15,7 +15,7 @@ using namespace std::string_view_literals;
 constexpr int BITS_OF_BYTE = 8;
 constexpr quint64 DECODED_PIXEL_BYTES = 4;
 
-// Numbers from the bytes; what lies beyond their end makes the reader fail, and reads as 0.
+// Reads numbers from the bytes. A read beyond the end gives 0 and makes all further reads fail.
 class Reader
 {
 public:
@@ -60,7 +60,8 @@ private:
     bool mHasFailed = false;
 };
 
-// The size of a picture whose decoder takes so many bytes for each pixel; none when that is too much.
+// Returns the size of a picture whose decoder needs pixelBytes bytes per pixel, or nothing if it exceeds a
+// limit.
 std::optional<QSize> limited(qint64 width, qint64 height, quint64 pixelBytes)
 {
     if (width < 1 || height < 1 || width > PictureGuard::MAX_SIDE || height > PictureGuard::MAX_SIDE)
@@ -85,7 +86,7 @@ std::optional<QSize> pngHeader(Reader& reader, quint64 at)
     return limited(width, height, isDeep ? DEEP_PIXEL_BYTES : DECODED_PIXEL_BYTES);
 }
 
-// Each chunk lies in the file as a whole, up to the one that ends the picture.
+// Requires every chunk, up to the end chunk, to be complete.
 std::optional<QSize> pngSize(Reader& reader)
 {
     constexpr quint64 AROUND_DATA = 12; // length, type and check sum
@@ -142,7 +143,7 @@ std::optional<QSize> bmpSize(Reader& reader)
 
 // --- JPEG -----------------------------------------------------------------------------------------------
 
-constexpr int MOST_SCANS = 100; // a picture that is stored in refinements has about ten
+constexpr int MOST_SCANS = 100; // a progressive picture normally has about ten
 constexpr quint8 JPEG_ESCAPE = 0xFF;
 
 bool isFrameMarker(quint8 marker)
@@ -155,7 +156,8 @@ bool isBareMarker(quint8 marker)
     return marker == 0x01 || (marker >= 0xD0 && marker <= 0xD8);
 }
 
-// In refinements, and in separate scans for the colours, all coefficients are kept: two bytes each.
+// For progressive pictures and for separate scans per component, the decoder keeps all coefficients of two
+// bytes each.
 std::optional<QSize> jpegFrame(Reader& reader, quint64 at, quint16 length)
 {
     constexpr quint16 AROUND_COMPONENTS = 8;
@@ -164,7 +166,7 @@ std::optional<QSize> jpegFrame(Reader& reader, quint64 at, quint16 length)
     const quint64 components = reader.byte(at + 7);
     if (components < 1 || components > 4 || length != AROUND_COMPONENTS + COMPONENT_BYTES * components)
         return {};
-    quint64 blocks = 0; // of all components, and of one that is stored in full
+    quint64 blocks = 0; // sampling blocks of all components, and of the largest one
     quint64 largest = 1;
     for (quint64 i = 0; i < components; ++i) {
         const quint8 sampling = reader.byte(at + 9 + COMPONENT_BYTES * i);
@@ -179,7 +181,7 @@ std::optional<QSize> jpegFrame(Reader& reader, quint64 at, quint16 length)
                    std::max(coefficients, DECODED_PIXEL_BYTES));
 }
 
-// Where the next marker stands, behind the data of a scan; the end of the file when there is none.
+// Returns the position of the marker that follows the data of a scan, or the end of the file.
 quint64 endOfScan(Reader& reader, std::string_view all, quint64 at)
 {
     while ((at = all.find(static_cast<char>(JPEG_ESCAPE), at)) != std::string_view::npos &&
@@ -192,7 +194,7 @@ quint64 endOfScan(Reader& reader, std::string_view all, quint64 at)
     return reader.size();
 }
 
-// A picture that was cut off within its data is shown as far as it goes.
+// Accepts a picture that is truncated within its data: the available part is shown.
 std::optional<QSize> jpegSize(Reader& reader)
 {
     constexpr quint8 SCAN = 0xDA;
@@ -231,7 +233,7 @@ quint64 gifColorBytes(quint8 flags)
     return (flags & 0x80) != 0 ? quint64(3) << ((flags & 7) + 1) : 0;
 }
 
-// Behind blocks of data, each with its length before it; none when they are not in the file.
+// Returns the position behind a sequence of length-prefixed data blocks, or nothing if it is incomplete.
 std::optional<quint64> endOfGifBlocks(Reader& reader, quint64 at)
 {
     for (;;) {
@@ -245,7 +247,7 @@ std::optional<quint64> endOfGifBlocks(Reader& reader, quint64 at)
     }
 }
 
-// The first frame is what is shown, but the decoder may look at all.
+// Only the first frame is shown, but the decoder may read all frames.
 std::optional<QSize> gifSize(Reader& reader)
 {
     constexpr quint8 EXTENSION = 0x21;
@@ -292,7 +294,8 @@ enum TiffTag : quint16 {
     TileLength = 323,
 };
 
-// The fields of a directory: the first number of each. None when the data of any is not in the file.
+// Returns the fields of a directory with the first value of each, or nothing if the data of a field is not in
+// the file.
 std::optional<std::map<quint16, quint64>> tiffFields(Reader& reader, bool isBigEndian, quint64 at)
 {
     constexpr quint64 ENTRY_BYTES = 12;
@@ -321,8 +324,8 @@ std::optional<std::map<quint16, quint64>> tiffFields(Reader& reader, bool isBigE
     return fields;
 }
 
-// Only the first picture of a file is shown, so only its directory counts. Files of more than 4 GB, which
-// have a format of their own, are not read.
+// Checks only the first directory, because only the first picture of a file is shown. Files of more than 4 GB
+// have another signature and are refused.
 std::optional<QSize> tiffSize(Reader& reader)
 {
     const bool isBigEndian = reader.text(0, 2) == "MM"sv;
@@ -339,7 +342,7 @@ std::optional<QSize> tiffSize(Reader& reader)
     const quint64 samples = field(SamplesPerPixel, 1);
     if (bits < 1 || bits > MOST_SAMPLE_BITS || samples < 1 || samples > MOST_SAMPLES)
         return {};
-    // A strip or tile is decoded as it is stored, and the picture beside it.
+    // The decoder needs memory for a strip or tile as stored and for the whole picture.
     const quint64 pixelBytes =
         std::max((bits * samples + BITS_OF_BYTE - 1) / BITS_OF_BYTE, DECODED_PIXEL_BYTES);
     const auto side = [](quint64 length) { return static_cast<qint64>(std::min<quint64>(length, 1 << 30)); };
@@ -352,7 +355,7 @@ std::optional<QSize> tiffSize(Reader& reader)
 
 struct Format {
     std::string_view signature;
-    const char* name; // Qt's
+    const char* name; // Qt's name of the format
     std::optional<QSize> (*size)(Reader&);
 };
 

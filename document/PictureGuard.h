@@ -1,31 +1,31 @@
-// Checks the bytes of a picture file before a decoder sees them.
-//
-// Decoders make room for what a header claims: a file of a few hundred bytes can take gigabytes, or minutes.
-// What a picture would take is therefore worked out from its headers here, and one that claims more than the
-// limits, or parts that are not in the file, is refused. A refused picture is an unreadable one. Any thread.
 #pragma once
 
 #include <QByteArray>
 #include <QSize>
 
+// Checks the bytes of a picture file before they are decoded.
+//
+// Decoders allocate what a header claims: a file of a few hundred bytes can need gigabytes of memory or
+// minutes of time. This class calculates the need from the headers and refuses a picture that exceeds the
+// limits or claims parts that are not in the file. A refused picture is treated as unreadable. Any thread.
 class PictureGuard
 {
 public:
-    static constexpr int MAX_SIDE = 8192; // pixels
+    static constexpr int MAX_SIDE = 8192; // in pixels
     static constexpr qint64 MAX_DECODED_BYTES = qint64(256) * 1024 * 1024;
 
-    // Looks through the headers of a whole file. Formats other than PNG, BMP, JPEG, GIF and TIFF are refused.
+    // Checks the headers of a whole file. Refuses formats other than PNG, BMP, JPEG, GIF and TIFF.
     explicit PictureGuard(const QByteArray& bytes);
 
     bool isAccepted() const { return !mFormat.isEmpty(); }
 
-    // Qt's name of the format; empty when refused. No other decoder may see the bytes.
+    // Returns Qt's name of the format; empty if refused. Only this decoder may read the bytes.
     QByteArray format() const { return mFormat; }
 
-    // In pixels, as stored; empty when refused.
+    // Returns the stored size in pixels; empty if refused.
     QSize size() const { return isAccepted() ? mSize : QSize(); }
 
-    // Whether bytes begin as those of one of the five formats do.
+    // Returns whether bytes begin with the signature of one of the five formats.
     static bool isKnown(const QByteArray& bytes);
 
 private:

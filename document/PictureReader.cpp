@@ -10,7 +10,7 @@
 namespace
 {
 
-// Qt's own limit is lower, and holds for every format.
+// Raises Qt's memory limit, which is lower and applies to every format.
 void setAllocationLimit()
 {
     static const bool isSet = [] {

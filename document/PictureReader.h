@@ -1,5 +1,3 @@
-// Decodes picture files that other programs may have made: the only way in which a picture file from the disk
-// becomes an image here. Any thread; made on the stack for one file.
 #pragma once
 
 #include <QByteArray>
@@ -8,28 +6,30 @@
 #include <QString>
 #include <string>
 
+// Decodes picture files from untrusted sources. All picture files on the disk are read through this class.
+// Any thread; made on the stack for one file.
 class PictureReader
 {
 public:
-    // No picture within the limits of PictureGuard is larger, stored in full.
+    // Limit of the file size in bytes; any picture within the limits of PictureGuard fits, even uncompressed.
     static constexpr qint64 MAX_FILE_BYTES = qint64(257) * 1024 * 1024;
 
-    // Reads the file into memory and has it checked. What is no plain file, too large, or refused has no
-    // size, and reads as null.
+    // Reads the file into memory and checks it. If it is not a regular file, too large, or refused, size() is
+    // empty and read() returns null.
     explicit PictureReader(const QString& path);
 
-    // In pixels, as stored.
+    // Returns the stored size in pixels.
     QSize size() const { return mSize; }
 
-    // Decodes the picture, at another size where one is given, which for some formats is quicker than to
-    // scale it later. Null when the decoder fails.
+    // Decodes the picture and scales it to scaledSize if that is valid, which for some formats is faster than
+    // scaling it later. Returns null if the decoder fails.
     QImage read(const QSize& scaledSize = QSize()) const;
 
-    // The same in one step.
+    // Reads, checks and decodes a file in one step.
     static QImage read(const QString& path);
 
 private:
-    QByteArray bytes() const; // not to be kept longer than this
+    QByteArray bytes() const; // shares the memory of mBytes; valid during the lifetime of this object
 
     std::string mBytes;
     QByteArray mFormat;

@@ -16,7 +16,7 @@
 namespace
 {
 
-// Higher levels make files a few percent smaller in twice the time.
+// Higher levels reduce the file size by a few percent but take twice the time.
 constexpr int COMPRESSION_LEVEL = 1;
 constexpr char SIGNATURE[] = "\x89PNG\r\n\x1a\n";
 constexpr unsigned char FILTER_UP = 2;
@@ -37,7 +37,7 @@ void appendChunk(QByteArray& bytes, const char* type, const char* data, qsizetyp
     bytes.append(number, 4);
 }
 
-// Lines whose colours are brought into the order of the file at a time: few enough to stay in the cache.
+// Number of lines that are converted to the file's colour order at a time; few enough to stay in the cache.
 constexpr int STRIP_LINES = 16;
 
 QImage stripInFileOrder(const QImage& image, int top)
@@ -49,7 +49,7 @@ QImage stripInFileOrder(const QImage& image, int top)
     return strip.convertToFormat(QImage::Format_ARGB32).convertToFormat(QImage::Format_RGBA8888);
 }
 
-// Differences of bytes, eight at a time. Their top bits are handled apart, so that no byte borrows from the
+// Subtracts bytes, eight at a time. The top bits are handled separately, so that no byte borrows from the
 // next.
 void subtract(const uchar* line, const uchar* above, uchar* out, std::size_t size)
 {
@@ -67,7 +67,8 @@ void subtract(const uchar* line, const uchar* above, uchar* out, std::size_t siz
         out[i] = static_cast<uchar>(line[i] - above[i]);
 }
 
-// All lines as differences to the line above: titles have large areas of one colour, which become zeros.
+// Returns all lines as differences to the line above: titles have large areas of one colour, where these are
+// zero.
 std::unique_ptr<uchar[]> filteredLines(const QImage& image, std::size_t lineSize)
 {
     const auto height = static_cast<std::size_t>(image.height());
@@ -75,7 +76,7 @@ std::unique_ptr<uchar[]> filteredLines(const QImage& image, std::size_t lineSize
     const auto blank = std::make_unique<uchar[]>(lineSize);
     const uchar* above = blank.get();
     uchar* out = filtered.get();
-    QImage previous; // holds the line above the first of a strip
+    QImage previous; // keeps the pixels that above points to
     for (int top = 0; top < image.height(); top += STRIP_LINES) {
         const QImage strip = stripInFileOrder(image, top);
         for (int y = 0; y < strip.height(); ++y) {
@@ -113,14 +114,14 @@ QByteArray encode32(const QImage& image)
     char header[13] = {};
     qToBigEndian(static_cast<quint32>(image.width()), header);
     qToBigEndian(static_cast<quint32>(image.height()), header + 4);
-    header[8] = 8;                // bits a channel
-    header[9] = hasAlpha ? 6 : 2; // colour, with or without alpha
+    header[8] = 8;                // bits per channel
+    header[9] = hasAlpha ? 6 : 2; // colour type with or without alpha
     appendChunk(bytes, "IHDR", header, sizeof header);
     if (image.dotsPerMeterX() > 0 || image.dotsPerMeterY() > 0) {
         char resolution[9];
         qToBigEndian(static_cast<quint32>(image.dotsPerMeterX()), resolution);
         qToBigEndian(static_cast<quint32>(image.dotsPerMeterY()), resolution + 4);
-        resolution[8] = 1; // per metre
+        resolution[8] = 1; // unit: metre
         appendChunk(bytes, "pHYs", resolution, sizeof resolution);
     }
     appendChunk(bytes, "IDAT", compressed.get(), static_cast<qsizetype>(compressedSize));
@@ -144,7 +145,7 @@ QByteArray PngWriter::encode(const QImage& image)
     if (image.isNull())
         return {};
     if (image.colorSpace().isValid() || !image.textKeys().isEmpty() || !image.offset().isNull())
-        return encodeByQt(image, "png"); // what is more than pixels is left to Qt
+        return encodeByQt(image, "png"); // Qt writes data other than pixels
     switch (image.format()) {
     case QImage::Format_RGB32:
     case QImage::Format_ARGB32:
@@ -160,7 +161,7 @@ QByteArray PngWriter::encodeFor(const QImage& image, const QString& path)
     const QByteArray format = QFileInfo(path).suffix().toLower().toLatin1();
     if (image.isNull() || format.isEmpty())
         return {};
-    if (format == "jpe") // which Qt does not know
+    if (format == "jpe") // unknown to Qt
         return encodeByQt(image, "jpeg");
     return format == "png" ? encode(image) : encodeByQt(image, format);
 }

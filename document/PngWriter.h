@@ -1,5 +1,3 @@
-// Writes pictures as files that are never seen half-written. PNG files are made by an encoder of this
-// program: at its compression level it takes a fraction of the time of QImage::save for the same pixels.
 #pragma once
 
 #include "support/AtomicFile.h"
@@ -9,20 +7,22 @@
 #include <QString>
 #include <string>
 
+// Saves pictures as files that are never visible half-written. PNG files are written by an encoder of this
+// program, whose compression level takes a fraction of the time of QImage::save.
 class PngWriter
 {
 public:
-    // Saves as QImage::save does, the format being that of the extension: what is read back has the same
-    // pixels, format and resolution. False, with the old file untouched, when the picture is null, the
-    // extension is that of no format, or the disk refuses. Any thread.
+    // Saves as QImage::save does, in the format of the extension: the saved picture has the same pixels,
+    // format and resolution. Returns false, with the old file unchanged, if the picture is null, the
+    // extension is unknown, or writing fails. Any thread.
     static bool save(const QImage& image, const QString& path,
                      AtomicFile::Durability durability = AtomicFile::Durability::Automatic);
 
-    // As save, without waiting for the disk to sync. A picture that the disk refuses is kept for its title,
-    // and written when the disk takes it (RefusedWrites).
+    // As save, but does not wait for a sync. A picture that cannot be written is kept for its title and
+    // written later (RefusedWrites).
     static bool saveOrKeep(const QImage& image, const QString& path, const std::string& title);
 
-    // The bytes of a PNG file; empty for a null picture.
+    // Returns the bytes of a PNG file; empty for a null picture.
     static QByteArray encode(const QImage& image);
 
 private:

@@ -31,7 +31,7 @@ int SettingManager::saveLastTextParameter(FontStyle* style)
         return 0;
     TiXmlDocument document;
     document.LinkEndChild(new TiXmlDeclaration(XML_VERSION, XML_ENCODING, STR_EMPTY));
-    auto* root = new TiXmlElement(SETTING_ROOT); // linked elements belong to the document
+    auto* root = new TiXmlElement(SETTING_ROOT); // the document owns linked elements
     root->SetAttribute(SETTING_TYPE, SETTING_TYPE_VAL);
     document.LinkEndChild(root);
     auto* element = new TiXmlElement(SETTING_FONT_STYLE);
@@ -77,7 +77,7 @@ int SettingManager::getFontStyle(TiXmlElement* element, FontStyle* style)
     shadow.setShadowColor(getAttribute(element, SETTING_FONT_SHADOW_COLOR));
     shadow.setShadowDirectionX(getIntAttribute(element, SETTING_FONT_SHADOW_DIRECTION_X));
     shadow.setShadowDirectionY(getIntAttribute(element, SETTING_FONT_SHADOW_DIRECTION_Y));
-    // Only whole radii are remembered, here and in the file.
+    // Only integer radii are stored, although the record has a double.
     shadow.setShadowBlurRadius(TitleParserUtility::truncated(
         TitleParserUtility::getDoubleAttribute(element, SETTING_FONT_SHADOW_BLUR_RADIUS)));
     style->setShadowPoint(shadow);

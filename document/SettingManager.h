@@ -1,4 +1,3 @@
-// The remembered text style. Made where it is needed; every call touches the file. GUI thread.
 #pragma once
 
 #include <string>
@@ -6,6 +5,8 @@
 class FontStyle;
 class TiXmlElement;
 
+// Stores the remembered text style. Constructed where it is needed; every call reads or writes the file. GUI
+// thread.
 class SettingManager
 {
 public:
@@ -32,19 +33,20 @@ public:
 
     SettingManager();
 
-    // 1 when the style was read. 0 leaves it as it was; on 1 what the file lacks is empty or zero.
+    // Returns 1 if the style was read; attributes that are missing in the file become empty or zero. Returns
+    // 0, with style unchanged, if the file cannot be read.
     int loadLastTextParameter(FontStyle* style);
 
-    // 1 when the style was handed to the disk; a refused save is not reported. 0 without a style or a folder.
+    // Returns 1 if the style was saved; 0 without a style or a folder, or if the file cannot be written.
     int saveLastTextParameter(FontStyle* style);
 
-    // Rewrites the file from what it holds, or from the defaults; 1.
+    // Rewrites the file with the style it contains, or with the defaults; always returns 1.
     int resetTextParameter();
 
-    // Folder of the imported fonts.
+    // Returns the folder of the imported fonts.
     std::wstring getImportFontsPath();
 
-    // Attribute mapping; always 1.
+    // Convert between the attributes of an element and a style; always return 1.
     int getFontStyle(TiXmlElement* element, FontStyle* style);
     int setFontStyle(TiXmlElement* element, FontStyle* style);
 

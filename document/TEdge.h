@@ -1,8 +1,8 @@
-// Outline of a run of text: a colour as "#rrggbb" and a width in points of the font's own scale.
 #pragma once
 
 #include <string>
 
+// Outline of a run of text: a colour as "#rrggbb" and a width in points relative to the font's own scale.
 class TEdge
 {
 public:

@@ -1,8 +1,8 @@
-// Drop shadow of a whole text object: a colour as "#rrggbb", an offset and a blur radius.
 #pragma once
 
 #include <string>
 
+// Drop shadow of a whole text object: a colour as "#rrggbb", an offset and a blur radius.
 class TShadow
 {
 public:
@@ -17,7 +17,7 @@ public:
     double getShadowBlurRadius() const { return mShadowBlurRadius; }
     void setShadowBlurRadius(double radius) { mShadowBlurRadius = radius; }
 
-    // Exact comparison, the blur radius included; a NaN equals nothing but its own record.
+    // Compares exactly, including the blur radius. A NaN is equal only within the same object.
     bool operator==(const TShadow& other) const;
 
 private:

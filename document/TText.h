@@ -1,6 +1,3 @@
-// One text object of a title: its text, place, alignment, shadow, and its runs in reading order.
-// Strings are UTF-8; positions are scene coordinates of the 1280 x 720 canvas.
-// A copy is deep: it shares neither runs nor shadow with its source.
 #pragma once
 
 #include "document/TShadow.h"
@@ -10,6 +7,9 @@
 #include <utility>
 #include <vector>
 
+// One text object of a title: its text, position, alignment, shadow, and its runs in reading order. Strings
+// are UTF-8; positions are scene coordinates of the 1280 x 720 canvas. A copy is deep, including runs and
+// shadow.
 class TText
 {
 public:
@@ -34,25 +34,24 @@ public:
     int getTextAlign() const { return mTextAlign; }
     void setTextAlign(int align) { mTextAlign = align; }
 
-    // 0 no shadow; 1 to 3 the presets.
+    // 0 for no shadow, 1 to 3 for the presets.
     int getShadowStyle() const { return mShadowStyle; }
     void setShadowStyle(int style) { mShadowStyle = style; }
 
-    // Never null, stays owned by this record, and is there to be changed in place. Kept while the style is 0,
-    // too.
+    // Never null. Owned by this record; may be changed in place. Keeps its values while the style is 0.
     TShadow* getTextShadow() { return &mTextShadow; }
     const TShadow* getTextShadow() const { return &mTextShadow; }
     void setTextShadow(const TShadow& shadow) { mTextShadow = shadow; }
 
-    // A copy of the vector; the runs stay owned by this record and are there to be changed in place.
+    // Returns a copy of the vector; this record keeps ownership of the runs, which may be changed in place.
     std::vector<TextStyle*> getTextItems() const { return mTextItems; }
 
-    // Takes the runs over. Those held before are NOT freed: call releaseVectorTextStyle() first to replace
-    // runs.
+    // Takes ownership of the runs. Does NOT delete the previous ones: call releaseVectorTextStyle() first to
+    // replace them.
     void setTextItems(const std::vector<TextStyle*>& items) { mTextItems = items; }
     void setTextItems(std::vector<TextStyle*>&& items) { mTextItems = std::move(items); }
 
-    // The same runs without a copy of the vector; valid until the runs are replaced.
+    // Returns the same runs without copying the vector; valid until the runs are replaced.
     const std::vector<TextStyle*>& textItems() const { return mTextItems; }
 
     // Deletes all runs.
@@ -60,7 +59,7 @@ public:
 
     bool XYZvalueIsTheSame(const TText& other) const;
 
-    // Shadows whose style is below 1 are the same whatever their values.
+    // Returns whether the shadows look the same. Shadows that are off are equal, whatever their values.
     bool shadowIsTheSame(const TText& other) const;
 
     bool textItemsIsTheSame(const TText& other) const;

@@ -15,7 +15,7 @@ TemplateManager* TemplateManager::mInstance = nullptr;
 namespace
 {
 
-// Empty when the folder is not told or cannot be made.
+// Returns an empty string if the folder is not configured or cannot be created.
 std::string templatesRoot()
 {
     return FolderLookup::multiByte(&IPathManagerEx::getTemplatesPath);

@@ -1,5 +1,3 @@
-// Look of one run of text in a TText. The canvas keeps every run at one character.
-// Strings are UTF-8, colours "#rrggbb". A copy shares nothing with its source.
 #pragma once
 
 #include "document/TEdge.h"
@@ -7,6 +5,8 @@
 #include <string>
 #include <utility>
 
+// Style of one run of text in a TText. In the canvas each run has exactly one character. Strings are UTF-8,
+// colours "#rrggbb". A copy is independent of its source.
 class TextStyle
 {
 public:
@@ -30,28 +30,28 @@ public:
     int isTextItalic() const { return mTextItalic; }
     void setIsTextItalic(int italic) { mTextItalic = italic; }
 
-    // Letter spacing in percent; 100 is the font's own.
+    // Letter spacing in percent; 100 is the font's normal spacing.
     int getTextKerning() const { return mTextKerning; }
     void setTextKerning(int kerning) { mTextKerning = kerning; }
 
-    // 0: no outline; any other value: the outline of getTextEdge() applies.
+    // 0 for no outline; with any other value the outline of getTextEdge() applies.
     int isTextEdge() const { return mIsTextEdge; }
     void setIsTextEdge(int edge) { mIsTextEdge = edge; }
 
-    // Kept while the outline is off, too.
+    // Keeps its values while the outline is off.
     TEdge getTextEdge() const { return mTextEdge; }
     void setTextEdge(TEdge edge) { mTextEdge = std::move(edge); }
 
-    // The same outline without a copy, for painting and saving.
+    // Returns the same outline without a copy, for painting and saving.
     const TEdge& textEdge() const { return mTextEdge; }
 
-    // Family, size, colour, bold and italic; neither kerning nor outline.
+    // Compares family, size, colour, bold and italic, but neither kerning nor outline.
     bool fontIsTheSame(const TextStyle& other) const;
 
-    // Outlines that are off are the same whatever their values.
+    // Compares the outlines. Outlines that are off are equal, whatever their values.
     bool edgeIsTheSame(const TextStyle& other) const;
 
-    // Everything but the alpha default font.
+    // Compares everything except the default font of the input language.
     bool operator==(const TextStyle& other) const;
 
 private:

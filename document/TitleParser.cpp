@@ -21,8 +21,8 @@
 namespace
 {
 
-// A title holds a thousand text items of eleven attributes each, so the attributes of an element are walked
-// once instead of being searched for one by one.
+// Fields of a text item. A title may have a thousand items of eleven attributes, so the attributes of an
+// element are read in one pass instead of being searched one by one.
 enum class ItemField {
     Text,
     Font,
@@ -45,8 +45,8 @@ constexpr std::array<std::string_view, 11> ITEM_FIELDS = {
     TitleParser::META_EDGE_WIDTH,         TitleParser::META_EDGE_COLOR,
 };
 
-// The field of an attribute name. Files list the attributes in the order of the table, so the field expected
-// next is tried first.
+// Returns the field of an attribute name. Files list the attributes in the order of the table, so the
+// expected next field is tried first.
 ItemField itemField(const std::string& name, std::size_t& expected)
 {
     for (std::size_t tried = 0; tried < ITEM_FIELDS.size(); ++tried) {
@@ -70,16 +70,16 @@ bool isControl(std::string_view text, std::size_t index)
     return c < 0x20 && c != '\t' && c != '\n' && c != '\r';
 }
 
-// U+FFFE or U+FFFF.
+// Returns whether the bytes at index are U+FFFE or U+FFFF.
 bool isNonCharacter(std::string_view text, std::size_t index)
 {
     const std::string_view bytes = text.substr(index, 3);
     return bytes == "\xEF\xBF\xBE" || bytes == "\xEF\xBF\xBF";
 }
 
-// A keyboard may send any character, and a file without an encoding bytes that are none. What XML cannot hold
-// would make the file unreadable for all other processes; a replacement character keeps the count of
-// characters.
+// Replaces bytes that XML cannot contain by U+FFFD, one per character, so that the number of characters stays
+// the same. A keyboard may send any character, and a file without an encoding may contain invalid bytes;
+// written as they are, they would make the file unreadable for all processes.
 std::string writable(const std::string& text)
 {
     static constexpr std::string_view REPLACEMENT = "\xEF\xBF\xBD";
@@ -152,7 +152,7 @@ std::string TitleParser::toBytes(const Archive& archive)
 {
     TiXmlDocument document;
     document.LinkEndChild(new TiXmlDeclaration(XML_VERSION, XML_ENCODING, STR_EMPTY));
-    auto* root = new TiXmlElement(TITLE_NODE_ROOT); // linked elements belong to the document
+    auto* root = new TiXmlElement(TITLE_NODE_ROOT); // the document owns linked elements
     writeMetaRoot(root, archive);
     document.LinkEndChild(root);
     auto* background = new TiXmlElement(NODE_BG);
@@ -193,7 +193,7 @@ int TitleParser::writeMetaText(TiXmlElement* metaText, const Archive& archive)
     metaText->SetAttribute(META_TEXT_OBJ_COUNT, static_cast<int>(archive.text().size()));
     for (const TText* text : archive.text()) {
         auto* content = new TiXmlElement(NODE_TEXT_OBJ_CONTENT);
-        writeMetaTextObject(content, text); // a missing text object leaves an empty element
+        writeMetaTextObject(content, text); // a null text object leaves an empty element
         metaText->LinkEndChild(content);
     }
     return 1;
@@ -221,7 +221,7 @@ int TitleParser::writeShadowValue(TiXmlElement* content, const TText& text)
     setText(content, META_SHADOW_COLOR, shadow.getShadowColor());
     content->SetAttribute(META_SHADOW_DIRECTION_X, shadow.getShadowDirectionX());
     content->SetAttribute(META_SHADOW_DIRECTION_Y, shadow.getShadowDirectionY());
-    // Other programs of the appliance read an integer here.
+    // Other programs of the appliance expect an integer here.
     content->SetAttribute(META_SHADOW_BLUR_RADIUS,
                           TitleParserUtility::truncated(shadow.getShadowBlurRadius()));
     return 1;

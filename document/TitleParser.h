@@ -1,6 +1,3 @@
-// Reads and writes the title files and the order file of a folder. Holds no state: any thread may make one
-// for a job. Reports by results only: 1 done, 0 refused. Missing attributes read as empty or zero, not as the
-// defaults of the records. Nothing locks a file; see AtomicFile for what readers of a file being saved see.
 #pragma once
 
 #include "document/KeyDefine.h"
@@ -14,6 +11,10 @@ class TText;
 class TextStyle;
 class TiXmlElement;
 
+// Reads and writes the title files and the order file of a folder. Stateless: any thread may construct one
+// for a job. Errors are reported only by results: 1 success, 0 failure. Missing attributes are read as empty
+// or zero, not as the defaults of the records. Files are not locked; see AtomicFile for concurrent reads and
+// writes.
 class TitleParser
 {
 public:
@@ -74,37 +75,38 @@ public:
     static constexpr char ORDER_INDEX_VAL[] = "value";
     static constexpr char ORDER_INDEX_FILEPATH[] = "file-path";
 
-    // Writes the title to the path in its record. -1, with errno, when the disk refuses the bytes: then the
-    // file that was there before is still there, whole. 0 for an empty path.
+    // Writes the title to the path in its record. Returns 0 for an empty path, and -1, with errno set and the
+    // old file unchanged, if writing fails.
     int writeOneTitle(Archive* archive);
 
-    // The bytes of the title's file.
+    // Returns the bytes of the title's file.
     std::string toBytes(const Archive& archive);
 
-    // Fills the record; on 0 it may be partly filled. Sets neither name nor order. Text objects that were in
-    // the record are not freed.
+    // Fills the record; if the result is 0 it may be partly filled. Sets neither name nor order. Does not
+    // delete text objects that were in the record.
     int readOneTitle(std::string path, Archive* archive);
 
-    // Change root attributes of a title file in place. 0 when the file cannot be read, -1 when the disk
-    // refuses it.
+    // Change root attributes of a title file in place. Return 0 if the file cannot be read, -1 if it cannot
+    // be written.
     int modifyProp(KeyDefine::TITLE_PROP_ID_t id, std::string path, std::string value);
     int modifyAttributeValue(const std::string& path, const std::string& key, const std::string& value);
     int modifyClip(std::string path, std::string value);
     int modifyGain(std::string path, std::string value);
     int modifyDensity(std::string path, std::string value);
 
-    // Rows of the folder's order file in document order, empty when it cannot be read. The caller owns them.
+    // Returns the rows of the folder's order file in document order; empty if it cannot be read. The caller
+    // owns them.
     std::vector<ArchiveOrder*> readFileOrderInFolder(std::string folder);
 
-    // Replaces the order file. -1, with the old file untouched, when the disk refuses.
+    // Replaces the order file. Returns -1, with the old file unchanged, if writing fails.
     int writeFileOrderInFolder(std::string folder, std::vector<ArchiveOrder> rows);
 
-    // The titles of a folder in the order of its order file; those that cannot be read are left out. The
-    // caller owns them. Both do the same.
+    // Return the titles of a folder in the order of its order file, without those that cannot be read. The
+    // caller owns them. Both functions do the same.
     std::vector<Archive*> getFilsByOrderInFolder(std::string folder);
     std::vector<Archive*> getFilesByOrderInFolderWithoutCheck(std::string folder);
 
-    // Depth-first search by name from start itself, children in document order.
+    // Searches depth first by name, beginning with start itself, children in document order.
     bool getNodePointerByName(TiXmlElement* start, const std::string& name, TiXmlElement*& out);
 
     std::string getAttribute(TiXmlElement* element, std::string key);

@@ -26,7 +26,7 @@ locale_t numberLocale()
     return locale;
 }
 
-// Some file systems do not tell the type in the directory entry.
+// Returns whether the entry is a folder. Some file systems do not store the type in the directory entry.
 bool isFolder(const std::string& folder, const dirent& entry)
 {
     if (entry.d_type != DT_UNKNOWN)
@@ -76,7 +76,7 @@ int TitleParserUtility::toInt(const std::string& text)
     const auto [end, error] = std::from_chars(text.data(), text.data() + text.size(), value);
     if (error == std::errc())
         return value;
-    // Blanks, a plus sign, or more digits than an int holds.
+    // leading blanks, a plus sign, or a number outside the range of int
     return static_cast<int>(std::strtol(text.c_str(), nullptr, 10));
 }
 

@@ -29,7 +29,7 @@ namespace
 
 const std::string TITLE_STEM = "Titler";
 
-// Empty when the folder is not told or cannot be made.
+// Returns an empty string if the folder is not configured or cannot be created.
 std::string userTemplatesRoot()
 {
     return FolderLookup::multiByte(&IPathManagerEx::getTitlerTemplatesPath);
@@ -47,14 +47,14 @@ bool isFolder(const std::string& path)
     return fs::is_directory(path, error);
 }
 
-// Whether this names an entry directly in a folder, and can stand in an XML file.
+// Returns whether name is a direct entry of a folder and can be written to an XML file.
 bool isEntryName(const std::string& name)
 {
     return !name.empty() && name != "." && name != ".." && name.find('/') == std::string::npos &&
            name.find('\0') == std::string::npos && Utf8::isValid(name);
 }
 
-// Names of all that a folder holds, in the directory's order.
+// Returns the names of all entries of a folder, in the directory's order.
 std::vector<std::string> entriesOf(const std::string& folder)
 {
     std::vector<std::string> names;
@@ -64,8 +64,8 @@ std::vector<std::string> entriesOf(const std::string& folder)
     return names;
 }
 
-// Extension of the pictures in a template's folder, which is that of the first entry with one, whatever it
-// is: whoever makes the folder puts the pictures there first.
+// Returns the extension of the first entry that has one: the creator of a template's folder puts the pictures
+// there first, and they all have the same extension.
 std::string pictureExtensionIn(const std::string& folder)
 {
     for (const std::string& name : entriesOf(folder)) {
@@ -76,7 +76,7 @@ std::string pictureExtensionIn(const std::string& folder)
     return {};
 }
 
-// Time of the last change for sorting: seconds above nanoseconds.
+// Returns the time of the last change as a sort key: seconds in the upper, nanoseconds in the lower 32 bits.
 long long timeKey(const struct stat& status)
 {
     const auto seconds = static_cast<unsigned long long>(status.st_mtim.tv_sec);
@@ -133,7 +133,7 @@ int UserTemplateManager::makeFolderList()
     }
     std::multimap<long long, std::string> byTime;
     for (const std::string& name : entriesOf(mRootFolder)) {
-        // One name that XML cannot hold would make the whole order file unreadable.
+        // A single name that XML cannot contain would make the whole order file unreadable.
         if (!isEntryName(name) || !isFolder(mRootFolder + STR_SLASH + name) ||
             !isTemplatePath(titlePathOf(name)))
             continue;
@@ -257,7 +257,7 @@ bool UserTemplateManager::isTemplatePath(const std::string& path) const
            ConfinedPath::isBelow(mRootFolder, isAbsolute ? path : mRootFolder + STR_SLASH + path);
 }
 
-// Paths come from files and from other processes: what is emptied must be one of our folders.
+// Paths come from files and other processes, so make sure that only a template's folder is deleted.
 bool UserTemplateManager::isTemplateFolder(const std::string& folder) const
 {
     const fs::path root = fs::path(mRootFolder).lexically_normal();

@@ -1,9 +1,9 @@
-// The operator's own templates. Each is a folder in the user-template root with a title file "Titler.xml" and
-// its pictures; the order file of the root names them in the order in which they are shown.
 #pragma once
 
 #include "document/ITemplateManager.h"
 
+// The operator's own templates. Each is a folder below the user-template root with a title file "Titler.xml"
+// and its pictures. The order file of the root lists them in the order in which they are shown.
 class UserTemplateManager : public ITemplateManager
 {
 public:
@@ -14,50 +14,53 @@ public:
     static constexpr char BG_SOURCE_BIG[] = "_source_1920";
     static constexpr char XML_EXTENSION[] = ".xml";
 
-    // The shared instance. Its first use writes a new order file from what the root holds, oldest first;
-    // cleanUp deletes it.
+    // Returns the shared instance; cleanUp deletes it. The first call creates it and writes a new order file
+    // with the existing templates, oldest first.
     static UserTemplateManager* getInstance();
     static void cleanUp();
 
-    // The same for every language. A template's name here is its folder's and "/Titler".
+    // Returns the same templates for every language. The name of a template is that of its folder followed by
+    // "/Titler".
     std::vector<Archive*> getTemplates(emTemplateLanguage language) override;
     std::string loadLastTemplatePath() override;
     int saveLastTemplatePath(std::string path) override;
 
-    // Both steps below.
+    // Calls makeFolderList() and createNewOrderXml().
     int reCreateNewOrderXml();
 
-    // Reads the names of the templates from the root, by the time of their title files. 0 without a root.
+    // Reads the names of the templates from the root, sorted by the time of their title files. Returns 0
+    // without a root.
     int makeFolderList();
 
-    // Writes the order file from the names. 0 without a root.
+    // Writes the order file from the names. Returns 0 without a root, -1 if writing fails.
     int createNewOrderXml();
 
-    // Gives a template another name in the order; the folder is the caller's. 0, with nothing written, when
-    // no template is called oldName.
+    // Renames a template in the order file; the caller renames the folder. Returns 0, with nothing written,
+    // if no template is called oldName.
     int renameInOrderXml(std::string oldName, std::string newName);
 
-    // Puts a template at the end of the order, where it may already stand elsewhere in it; 1.
+    // Moves or adds a template to the end of the order; always returns 1.
     int addNewTemplateToLastInOrderXml(std::string name);
 
-    // Takes a template out of the order, which stays as it is otherwise. 0, with nothing written, when none
-    // has the name.
+    // Removes a template from the order. Returns 0, with nothing written, if there is no template of that
+    // name.
     int removeFromOrderXml(std::string name);
 
-    // Reads a template and sets the record's name to that of the folder, also when it cannot be read (0).
+    // Reads a template and sets the record's name to that of the folder, even if it cannot be read (result
+    // 0).
     int loadTemplate(std::string name, Archive* archive);
 
-    // Writes the title file of a template whose folder holds its pictures already, over one that is there,
-    // and names title file and pictures in the record. 0 when there is no such folder, or no such name of a
-    // folder; -1 when the disk refuses.
+    // Writes the title file of a template whose folder already contains its pictures, and sets the names of
+    // the title file and the pictures in the record. Replaces an existing title file. Returns 0 if the name
+    // is invalid or the folder does not exist, -1 if writing fails.
     int createNewTemplateXml(std::string name, Archive* archive);
 
-    // Removes the template with this title file, its folder and all that this holds, and makes the order
-    // anew. What lies elsewhere than below the root stays. 1 when the title file was removed.
+    // Deletes the template with this title file, including its folder with all contents, and rebuilds the
+    // order file. Paths outside the root are refused. Returns 1 if the title file was removed.
     int deleteTemplatePath(std::string path);
 
-    // Whether a path lies below the root with all links resolved. One that is not absolute is one in the
-    // root.
+    // Returns whether a path is below the root after all links are resolved. A relative path is taken as
+    // relative to the root.
     bool isTemplatePath(const std::string& path) const;
 
 private:
@@ -67,6 +70,6 @@ private:
 
     static UserTemplateManager* mInstance;
     std::string mRootFolder;
-    std::string mSettingFolder; // of the template taken last; the same folder
+    std::string mSettingFolder; // folder of the file with the last template; equals mRootFolder
     std::vector<std::string> mFolderList;
 };

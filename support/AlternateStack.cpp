@@ -6,10 +6,11 @@
 namespace
 {
 
-// Many times what the unwinder and the registers of any processor take.
+// Far more than stack unwinding and the saved registers of any processor need.
 constexpr std::size_t STACK_BYTES = 256 * 1024;
 
-// Below it, so that a handler that needs more ends the process instead of spoiling what lies there.
+// Inaccessible pages below the stack: a handler that needs more than STACK_BYTES ends the process instead of
+// overwriting other memory.
 constexpr std::size_t GUARD_BYTES = 64 * 1024;
 
 } // namespace

@@ -1,13 +1,14 @@
-// A stack of its own for the signal handlers of a thread, so that a fault can be reported that comes from the
-// end of the thread's stack. Each thread needs one for itself.
 #pragma once
 
 #include <csignal>
 
+// Provides a separate stack for the signal handlers of one thread, so that a stack overflow in that thread
+// can still be reported.
 class AlternateStack
 {
 public:
-    // Gives the calling thread one until it ends. Does nothing where it has one, or where memory is short.
+    // Installs an alternate stack for the calling thread until the thread ends. Does nothing if the thread
+    // has one already or if memory is short.
     static void useInThisThread();
 
     AlternateStack(const AlternateStack&) = delete;

@@ -19,7 +19,7 @@ namespace
 
 constexpr int READ_ATTEMPTS = 3;
 
-// A file descriptor that closes itself.
+// Closes its file descriptor in the destructor.
 class Descriptor
 {
 public:
@@ -74,7 +74,7 @@ bool copyAll(int from, int to)
     }
 }
 
-// The file that a path leads to, and what is there now.
+// The file to be written, after links are resolved, and its status if it exists.
 struct Target {
     std::string path;
     struct stat status = {};
@@ -94,7 +94,7 @@ bool resolve(const std::string& path, AtomicFile::Links links, Target& target)
     if (!S_ISLNK(target.status.st_mode))
         return true;
     if (links == AtomicFile::Links::Replace) {
-        target.exists = false; // what the link leads to is not the target
+        target.exists = false; // the link itself is replaced, not the file it leads to
         return true;
     }
     char resolved[PATH_MAX];
@@ -115,7 +115,7 @@ Descriptor openTemporary(const Target& target, std::string& name)
     } while (descriptor < 0 && (errno == EEXIST || errno == EINTR));
     if (descriptor >= 0 && target.exists) {
         if (target.status.st_uid != ::geteuid() || target.status.st_gid != ::getegid()) {
-            // Only root can hand a file over; anyone else becomes the owner of what he saves.
+            // Only root can give a file to another owner; other users become the owner of what they save.
             if (::fchown(descriptor, target.status.st_uid, target.status.st_gid) != 0)
                 errno = 0;
         }
@@ -124,7 +124,7 @@ Descriptor openTemporary(const Target& target, std::string& name)
     return Descriptor(descriptor);
 }
 
-// Makes the new file by fill(descriptor) and puts it in the place of the old one.
+// Has fill(descriptor) write a temporary file and renames it over the file at path.
 template <typename Fill>
 bool replaceFile(const std::string& path, AtomicFile::Durability durability, AtomicFile::Links links,
                  Fill fill)
@@ -137,7 +137,7 @@ bool replaceFile(const std::string& path, AtomicFile::Durability durability, Ato
             errno = EISDIR;
             return false;
         }
-        if (!S_ISREG(target.status.st_mode)) { // a device takes the bytes as they come
+        if (!S_ISREG(target.status.st_mode)) { // devices and pipes are written directly
             Descriptor device(::open(target.path.c_str(), O_WRONLY | O_CLOEXEC | O_NONBLOCK));
             return device.isOpen() && fill(device.get()) && device.close();
         }
@@ -167,7 +167,8 @@ bool replaceFile(const std::string& path, AtomicFile::Durability durability, Ato
         ::unlink(temporary.c_str());
         errno = error;
     } else if (isNow && !FileSyncQueue::syncFolder(HiddenName::folderOf(target.path))) {
-        FileSyncQueue::enqueue(target.path); // in its place for every reader; the disk is asked again
+        // renamed already, so readers see it; the sync is tried again later
+        FileSyncQueue::enqueue(target.path);
     }
     return isDone;
 }

@@ -1,43 +1,44 @@
-// Whole-file reads and writes. A write puts the bytes beside the target and renames them over it, so that
-// readers in this and other processes see the old file or the new one and never a part, and a killed process,
-// a full disk or a cut power leaves the old file where the new one is not complete.
-//
-// A write from the main thread never waits for the disk: the last version known to be on the disk is kept
-// under a hidden name until a background thread has brought the new one there (see FileSyncQueue).
-// LeftoverSweep tidies up after a process that had no time to.
 #pragma once
 
 #include <cstddef>
 #include <string>
 #include <string_view>
 
+// Reads and writes whole files. A write puts the bytes into a temporary file beside the target and renames it
+// over the target. Readers in this and in other processes therefore see either the old file or the new one,
+// never a part of it; after a crash, a full disk or a power cut the old file is still there unless the new
+// one is complete.
+//
+// A write from the main thread never waits for the disk: the last version known to be on the disk is kept
+// under a hidden name until a background thread has synced the new one (see FileSyncQueue). LeftoverSweep
+// removes or restores what a killed process left behind.
 class AtomicFile
 {
 public:
     enum class Durability {
         Automatic, // SyncLater on the main thread, SyncNow on any other
-        SyncNow,   // on the disk when the call returns
-        SyncLater, // brought to the disk by the background thread
+        SyncNow,   // synced to the disk when the call returns
+        SyncLater, // synced by the background thread
     };
 
-    // What a symbolic link at the path of a write means.
+    // Selects what happens if the path of a write is a symbolic link.
     enum class Links {
         Follow,  // the file that it leads to is written
-        Replace, // a file takes its place; what it leads to is left alone
+        Replace, // the link is replaced by a file; the file it led to is not changed
     };
 
-    // Replaces the file at path, or makes it. False, with the old file untouched, when that cannot be done:
-    // the disk is full, the folder is missing or read-only, the file itself is not writable. The permissions
-    // of an existing file stay, but for those to write of others than its owner. errno says why it cannot be
-    // done. What RefusedWrites kept for the file before is forgotten once this is written. Any thread.
+    // Replaces the file at path, or creates it. Returns false, with the old file unchanged and errno set, if
+    // that fails: the disk is full, the folder is missing or read-only, or the file itself is not writable.
+    // An existing file keeps its permissions except write permission for group and others. Bytes that
+    // RefusedWrites kept for the file before this call are dropped once this write succeeds. Any thread.
     static bool write(const std::string& path, std::string_view bytes,
                       Durability durability = Durability::Automatic, Links links = Links::Follow);
 
-    // Replaces target by a copy of the file source, as write does. A link at target is replaced.
+    // Replaces target by a copy of the file source, as write does. If target is a link, the link is replaced.
     static bool copy(const std::string& source, const std::string& target,
                      Durability durability = Durability::Automatic);
 
-    // Reads a plain file of at most maximum bytes; false otherwise, errno says why. Tries again when the disk
-    // reports an error. Never waits on a pipe or device. Any thread.
+    // Reads a regular file of at most maximum bytes; returns false for anything else, errno says why. Tries
+    // again when the disk reports an error. Never blocks on a pipe or device. Any thread.
     static bool read(const std::string& path, std::size_t maximum, std::string& bytes);
 };

@@ -20,8 +20,8 @@ namespace
 constexpr int REFUSAL_NUMBER = 400;
 constexpr std::size_t REMEMBERED_REFUSALS = 256;
 
-// Templates go first: to ask for a folder makes it, and whoever fills the data path writes the templates
-// before there is a folder of titles.
+// The templates come first because asking for a folder creates it: a data path is filled with templates
+// before it has a folder of titles.
 constexpr std::array<FolderLookup::Getter, 3> TITLE_ROOTS{&IPathManagerEx::getTemplatesPath,
                                                           &IPathManagerEx::getTitlerTemplatesPath,
                                                           &IPathManagerEx::getTitleResourcesPath};
@@ -32,13 +32,14 @@ std::string currentFolder()
     return ::getcwd(buffer, sizeof buffer) ? buffer : "";
 }
 
-// The path without links and without "." and ".."; empty when that cannot be said. The end of the path need
-// not exist.
+// Returns the absolute path without links, "." and "..", or an empty string if it cannot be resolved. The
+// last components need not exist.
 std::string resolved(std::string path)
 {
     if (path.empty() || path.find('\0') != std::string::npos)
         return {};
-    if (path.front() != '/') // as the appliance's own paths are where its root is the file system's
+    // as with the appliance's own paths, which are relative if its root folder is "/"
+    if (path.front() != '/')
         path.insert(0, currentFolder() + '/');
     std::string missing;
     for (;;) {
@@ -50,7 +51,8 @@ std::string resolved(std::string path)
             return whole + missing;
         }
         struct stat status = {};
-        if (errno != ENOENT || ::lstat(path.c_str(), &status) == 0) // a link to nothing may become one
+        // refuse a dangling link: its target may be created later
+        if (errno != ENOENT || ::lstat(path.c_str(), &status) == 0)
             return {};
         const std::size_t slash = path.rfind('/');
         const std::string name = path.substr(slash + 1);
@@ -84,7 +86,8 @@ bool isLink(const std::string& path)
     return ::lstat(path.c_str(), &status) == 0 && S_ISLNK(status.st_mode);
 }
 
-// A name that stays in its folder as long as it is not that of a link, which is cheap to see.
+// Returns whether the name is a direct entry of its folder. This needs no disk access; the caller checks
+// whether the entry is a link.
 bool isEntryName(std::string_view name)
 {
     return name.find('/') == std::string_view::npos && name.find('\0') == std::string_view::npos &&
@@ -102,7 +105,7 @@ bool climbs(std::string_view name)
     return false;
 }
 
-// A title is looked at again and again; its log line stands once.
+// Titles are read repeatedly; each refusal is logged only once.
 bool isNewRefusal(const std::string& path)
 {
     static std::mutex mutex;

@@ -1,35 +1,35 @@
-// Keeps paths that come from outside below the folders that they are for. A request of another process, a row
-// of an order file and a name in a title file are all written by somebody else: what they lead to is looked
-// at after all links are resolved. All functions may be called from any thread.
 #pragma once
 
 #include "support/FolderLookup.h"
 
 #include <string>
 
+// Confines paths that come from outside to the folders they are meant for. Requests of other processes, rows
+// of order files and names in title files are not trusted: a path is checked after all links in it are
+// resolved. All functions may be called from any thread.
 class ConfinedPath
 {
 public:
     ConfinedPath() = delete;
 
-    // Whether a path lies below the folder, at any depth, once the links in both are resolved. The folder
-    // itself does not. What does not exist yet is taken by its name; a link to nothing is refused.
+    // Returns whether path is below folder, at any depth, after the links in both are resolved; false for the
+    // folder itself. Components that do not exist yet are compared by name; a dangling link is refused.
     static bool isBelow(const std::string& folder, const std::string& path);
 
-    // The same for a folder of the appliance, such as &IPathManagerEx::getTitleResourcesPath. False while
-    // that folder is not known.
+    // As above for a folder of the appliance, such as &IPathManagerEx::getTitleResourcesPath. Returns false
+    // while that folder is unknown.
     static bool isBelow(FolderLookup::Getter root, const std::string& path);
 
-    // Returns the path of a picture that a title file in the folder names; empty, with a line in the log, for
-    // one that lies neither below the folder nor below the folders of titles and templates.
+    // Returns the path of a picture that a title file in folder names. Logs and returns an empty string if
+    // the picture is neither below folder nor below the folders of titles and templates.
     static std::string namedByTitle(const std::string& folder, const std::string& path);
 
-    // Returns the path of a title that the order file of a folder names. Empty, with a line in the log, for
-    // one that leaves the folder by its name, or by a link to where no titles and templates are. An empty
-    // name is refused without a line.
+    // Returns the path of a title that the order file of a folder names. Logs and returns an empty string if
+    // the name contains "..", or if a link leads outside the folder and outside the folders of titles and
+    // templates. An empty name is refused without logging.
     static std::string namedByOrder(const std::string& folder, const std::string& name);
 
-    // Writes the line of a refusal to the debug log; the same refusal is not repeated by the two functions
-    // above. what says who named the path.
+    // Writes a refusal to the debug log. what is the beginning of the text and describes the source of the
+    // path. The two functions above log each path only once.
     static void logRefusal(const std::wstring& what, const std::string& path);
 };

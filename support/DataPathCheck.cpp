@@ -19,7 +19,7 @@ namespace DataPathCheck
 namespace
 {
 
-// In quotes, and in one line whatever it holds.
+// Returns the path in quotes, with control characters replaced so that it stays on one line.
 std::string quoted(const std::string& path)
 {
     std::string text = "\"";
@@ -30,7 +30,7 @@ std::string quoted(const std::string& path)
     return text + "\"";
 }
 
-// 0, or what stands against making files in the folder. A full disk does not.
+// Returns 0, or the errno that prevents the creation of files in the folder. A full disk is not reported.
 int writeError(const std::string& folder)
 {
     const int file = open(folder.c_str(), O_TMPFILE | O_RDWR | O_CLOEXEC, S_IRUSR | S_IWUSR);
@@ -42,7 +42,7 @@ int writeError(const std::string& folder)
     case ENOSPC:
     case EDQUOT:
         return 0;
-    case EOPNOTSUPP: // a file system without nameless files
+    case EOPNOTSUPP: // the file system does not support O_TMPFILE
     case EISDIR:
     case ENOENT:
         return access(folder.c_str(), W_OK | X_OK) == 0 ? 0 : errno;
@@ -74,7 +74,7 @@ std::string problem()
     }
     const std::string folder = wideToMultiByte(PathManagerEx().getDefaultPath());
     if (folder.empty() || folder.front() != '/') {
-        return std::string(); // taken from where the process was started
+        return std::string(); // relative to the working directory; not checked
     }
     boost::system::error_code error;
     boost::filesystem::create_directories(folder, error);

@@ -1,18 +1,18 @@
-// Whether the appliance's data path can be worked with.
 #pragma once
 
 #include <string>
 
+// Checks at start whether the appliance's data path is usable.
 namespace DataPathCheck
 {
 
-// The exit code of a program that cannot.
+// The exit code of a program whose data path is not usable.
 constexpr int EXIT_CODE = 2;
-// Bytes of the longest path that fits everywhere.
+// Length in bytes of the longest data path that every user of it can handle.
 constexpr std::size_t MAX_LENGTH = 99;
 
-// What is wrong with the data path, in one line without an end; empty when nothing is. Makes the folder of
-// the user in it where that is missing.
+// Returns what is wrong with the data path as one line without a line feed, or an empty string if it is
+// usable. Creates the user's folder in it if that is missing.
 std::string problem();
 
 } // namespace DataPathCheck

@@ -18,7 +18,7 @@
 namespace
 {
 
-constexpr std::size_t LARGEST_FILE = 256 * 1024 * 1024; // that this program writes
+constexpr std::size_t LARGEST_FILE = 256 * 1024 * 1024; // of any file that this program writes
 
 enum class SyncResult { Done, Missing, Failed };
 
@@ -27,7 +27,7 @@ SyncResult syncOne(const std::string& path, int flags)
     const int descriptor = ::open(path.c_str(), O_RDONLY | O_CLOEXEC | O_NONBLOCK | flags);
     if (descriptor < 0)
         return errno == ENOENT || errno == ENOTDIR ? SyncResult::Missing : SyncResult::Failed;
-    // Some file systems have nothing to sync.
+    // Some file systems do not support fsync.
     const bool isDone = ::fsync(descriptor) == 0 || errno == EINVAL || errno == ENOTSUP || errno == EROFS;
     ::close(descriptor);
     return isDone ? SyncResult::Done : SyncResult::Failed;
@@ -36,8 +36,8 @@ SyncResult syncOne(const std::string& path, int flags)
 class Queue
 {
 public:
-    // Never destroyed: its thread may be at work until the process has gone. What is left then is swept at
-    // the next start.
+    // Never destroyed, because its thread may run until the process ends. LeftoverSweep cleans up at the next
+    // start.
     static Queue& instance()
     {
         static Queue* const queue = new Queue;
@@ -47,8 +47,8 @@ public:
     bool publish(const std::string& temporary, const std::string& path)
     {
         const std::lock_guard lock(mMutex);
-        // A file that is still queued is not on the disk, so what was kept for it before stays the one to
-        // keep.
+        // A file that is still queued is not on the disk yet, so the version that was kept for it remains the
+        // one to keep.
         const bool isQueued = mEntries.contains(path);
         const std::string kept = isQueued ? std::string() : HiddenName::kept(path);
         const bool isLinked = !kept.empty() && ::link(path.c_str(), kept.c_str()) == 0;
@@ -168,13 +168,13 @@ private:
                 std::unique_lock<std::mutex>& lock)
     {
         const auto entry = mEntries.find(path);
-        if (entry->second.generation != generation) { // saved again meanwhile
+        if (entry->second.generation != generation) { // saved again in the meantime
             mOrder.push_back(path);
             return;
         }
-        // The file is on the disk now, and a save from here on keeps it. Freeing the blocks of the old
-        // version can take a while, and a save must not wait for that behind the lock: inside it the version
-        // only gets another name.
+        // The file is on the disk now; the next save will keep it as the last synced version. The old version
+        // is only renamed while the lock is held: freeing its blocks may take long, and a save must not wait
+        // for that.
         std::string discarded;
         if (entry->second.isKept && result != SyncResult::Failed) {
             discarded = HiddenName::temporary(HiddenName::folderOf(path));
@@ -251,7 +251,8 @@ bool FileSyncQueue::hasFailed()
 void FileSyncQueue::retryFailed()
 {
     for (const std::string& path : Queue::instance().failed()) {
-        // After a failure the system may count the pages as clean: only new ones are sure to be written.
+        // After a failed fsync the kernel may regard the pages as clean; only newly written ones are sure to
+        // reach the disk.
         std::string bytes;
         if (AtomicFile::read(path, LARGEST_FILE, bytes))
             AtomicFile::write(path, bytes, AtomicFile::Durability::SyncLater);

@@ -1,8 +1,3 @@
-// Brings files that were renamed into place to the disk on a background thread, so that the thread that saved
-// them need not wait. Until that is done, the version that was on the disk before is kept under a hidden hard
-// link beside the file; if the power goes first, LeftoverSweep puts it back.
-//
-// All functions may be called from any thread; none but flush and syncFolder waits for the disk.
 #pragma once
 
 #include <chrono>
@@ -10,37 +5,43 @@
 #include <string>
 #include <vector>
 
+// Syncs files that were renamed into place to the disk on a background thread, so that the thread that saved
+// them need not wait. Until a file is synced, the version that was on the disk before is kept as a hidden
+// hard link beside it; after a power cut LeftoverSweep restores that version.
+//
+// All functions may be called from any thread; only flush and syncFolder wait for the disk.
 class FileSyncQueue
 {
 public:
-    // Renames temporary over path, keeping the last version known to be on the disk, and queues path. False,
-    // with nothing changed, when the rename fails.
+    // Renames temporary to path, keeps the last version known to be on the disk, and queues path. Returns
+    // false, with nothing changed, if the rename fails.
     static bool publish(const std::string& temporary, const std::string& path);
 
-    // Renames a temporary whose bytes are on the disk already. The folder is left to the caller.
+    // Renames a temporary file whose bytes are synced already. The caller syncs the folder.
     static bool publishSynced(const std::string& temporary, const std::string& path);
 
-    // Queues a file that is in its place, but of which it is not sure that it is on the disk.
+    // Queues a file that is already in place but may not be on the disk yet.
     static void enqueue(const std::string& path);
 
-    // Brings the entries of a folder to the disk, and waits for it. False when the disk fails.
+    // Syncs the entries of a folder and waits for that. Returns false if the disk fails.
     static bool syncFolder(const std::string& folder);
 
-    // What becomes of a kept version that a sweep found.
+    // Selects what happens to a kept version that LeftoverSweep found.
     enum class Kept { Discard, DiscardAfterSync, Restore };
 
-    // Does nothing for a file that this process has queued: its kept version is in use.
+    // Applies the decision to the kept version of path. Does nothing if this process has queued the file,
+    // because the kept version is still needed then.
     static void settleKept(const std::string& path, Kept decision);
 
-    // Waits until all that is queued is on the disk, at most as long as given. True when it is.
+    // Waits at most this long until all queued files are on the disk; returns whether they are.
     static bool flush(std::chrono::milliseconds deadline);
 
-    // Files that are queued, and those that the disk failed to take although they are in their place for
-    // every reader. Of these the version before is still kept.
+    // Returns the files that are queued and those that could not be synced. The latter are in place for every
+    // reader, and their previous version is still kept.
     static std::vector<std::string> unsynced();
     static bool hasFailed();
-    // Writes and queues those that failed once more.
+    // Writes and queues again the files that could not be synced.
     static void retryFailed();
-    // Called by the background thread when the disk has failed. Null: nobody is told.
+    // Sets the function that the background thread calls when a sync has failed; null removes it.
     static void setListener(std::function<void()> listener);
 };

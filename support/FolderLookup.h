@@ -1,11 +1,11 @@
-// Asks where a folder of the appliance lies, for callers that can go on without it: a folder that cannot be
-// made, on a read-only disk or because a file has its name, is as good as one that nobody told of.
 #pragma once
 
 #include <string>
 
 class IPathManagerEx;
 
+// Asks where a folder of the appliance is, for callers that can do without it: a folder that cannot be
+// created, on a read-only disk or because a file has its name, is treated like one that is not configured.
 class FolderLookup
 {
 public:
@@ -13,8 +13,8 @@ public:
 
     FolderLookup() = delete;
 
-    // The path of IPathManagerEx's getter, empty where it would throw. Any thread.
+    // Returns the result of an IPathManagerEx getter, or an empty string if the getter throws. Any thread.
     static std::wstring wide(Getter getter);
-    // The same in the encoding of file names.
+    // As wide(), in the encoding of file names.
     static std::string multiByte(Getter getter);
 };

@@ -13,13 +13,13 @@ namespace
 constexpr std::string_view TEMPORARY_PREFIX = ".titler-new-";
 constexpr std::string_view KEPT_PREFIX = ".titler-kept-";
 
-// Start time of a process in clock ticks since boot; with the process id it names a process for good.
-// 0 when there is no such process.
+// Returns the start time of a process in clock ticks since boot, or 0 if there is no such process. Process id
+// and start time together identify a process, even if ids are reused.
 unsigned long long startTime(long pid)
 {
     std::ifstream file("/proc/" + std::to_string(pid) + "/stat");
     const std::string line((std::istreambuf_iterator<char>(file)), std::istreambuf_iterator<char>());
-    std::size_t at = line.rfind(')'); // the name before it may hold blanks
+    std::size_t at = line.rfind(')'); // skip the process name, which may contain blanks
     if (at == std::string::npos)
         return 0;
     ++at;
@@ -40,7 +40,7 @@ std::string ownerTag()
     };
     static thread_local Tag tag{-1, {}};
     const long pid = getpid();
-    if (tag.pid != pid) // also after a fork
+    if (tag.pid != pid) // the process id changes after a fork
         tag = {pid, std::to_string(pid) + '-' + std::to_string(startTime(pid)) + '-'};
     return tag.text;
 }

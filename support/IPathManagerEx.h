@@ -1,18 +1,18 @@
-// Says where the appliance's files of each kind live. Paths are absolute and without a final "/"; a getter
-// gives an empty string while the path file or its entry is missing, and makes the folder when it does not
-// exist. Any thread; file-system errors of making a folder are thrown.
 #pragma once
 
 #include <string>
 
 class PathManagerEx;
 
+// Reports where the appliance's files of each kind are. Paths are absolute and have no final "/". A getter
+// returns an empty string if the path file or its entry is missing, and creates the folder if it does not
+// exist; file-system errors are thrown. Any thread.
 class IPathManagerEx
 {
 public:
     virtual ~IPathManagerEx() = default;
 
-    // Makes a folder with a new unique name in parent and returns its path.
+    // Creates a folder with a new unique name in parent and returns its path.
     virtual std::wstring CreateNewFolder(std::wstring parent) = 0;
     virtual std::wstring getDataPath() = 0;
     virtual std::wstring getResourcesPath() = 0;
@@ -35,8 +35,8 @@ public:
     virtual std::wstring getMPMoviesPath() = 0;
     virtual std::wstring getTitlerTemplatesPath() = 0;
 
-    // The one instance, made on first use. clearUp deletes it; the next use makes a new one, with empty
-    // caches.
+    // Returns the only instance, which is created on first use. clearUp deletes it; the next use creates a
+    // new one with empty caches.
     static IPathManagerEx* getInstance();
     static void clearUp();
 

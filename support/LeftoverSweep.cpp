@@ -34,7 +34,7 @@ std::uint32_t bigEndian32(const char* p)
     return (std::uint32_t(b[0]) << 24) | (std::uint32_t(b[1]) << 16) | (std::uint32_t(b[2]) << 8) | b[3];
 }
 
-// Walks the chunks and their check sums up to the end chunk.
+// Returns whether all chunks up to the end chunk are present and have valid check sums.
 bool isWholePng(const std::string& path)
 {
     std::string bytes;
@@ -56,7 +56,7 @@ bool isWholePng(const std::string& path)
     return false;
 }
 
-// Whether the bytes at path are whole, as those of a file called name.
+// Returns whether the file at path is complete; name decides about its type.
 bool isWholeAs(const std::string& path, const std::string& name)
 {
     if (hasExtension(name, ".xml")) {
@@ -76,7 +76,7 @@ void settleKept(const std::string& folder, const std::string& name)
     struct stat status = {};
     if (::lstat(path.c_str(), &status) != 0)
         FileSyncQueue::settleKept(path, FileSyncQueue::Kept::Discard);
-    else if (isWholeAs(path, path)) // as this machine sees it, which need not mean on the disk
+    else if (isWholeAs(path, path)) // complete in the page cache, which does not prove that it is on the disk
         FileSyncQueue::settleKept(path, FileSyncQueue::Kept::DiscardAfterSync);
     else if (isWholeAs(kept, path))
         FileSyncQueue::settleKept(path, FileSyncQueue::Kept::Restore);

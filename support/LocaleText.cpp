@@ -21,7 +21,7 @@ locale_t openTextLocale()
     return newlocale(LC_CTYPE_MASK, "C.UTF-8", nullptr);
 }
 
-// Gives the calling thread the text locale for as long as the object lives.
+// Sets the text locale for the calling thread during the lifetime of the object.
 class TextLocaleScope
 {
 public:
@@ -71,7 +71,7 @@ std::wstring multiByteToWide(const char* text, std::size_t length)
     while (length > 0) {
         wchar_t character = L'\0';
         const std::size_t count = std::mbrtowc(&character, text, length, &state);
-        if (count == 0 || count > length) { // a NUL, an invalid or an unfinished sequence
+        if (count == 0 || count > length) { // a NUL, an invalid or an incomplete sequence
             break;
         }
         result.push_back(character);

@@ -51,7 +51,8 @@ void LogFile::open()
         close();
         return;
     }
-    // Whatever the umask, and also where an older program left it open to others. It may be another user's.
+    // Independent of the umask, and also for files that an older version left open to others. Fails, without
+    // effect, if another user owns the file.
     if ((status.st_mode & 07777) != MODE && ::fchmod(mDescriptor, MODE) != 0)
         errno = 0;
 }
@@ -63,7 +64,7 @@ void LogFile::close()
     mDescriptor = -1;
 }
 
-// Not after another process has moved the file aside, or somebody has removed it.
+// Returns false after another process has renamed the file or somebody has deleted it.
 bool LogFile::isThatOfPath() const
 {
     struct stat own = {};
@@ -82,15 +83,15 @@ bool LogFile::isFullWith(std::size_t size) const
 void LogFile::makeRoomFor(std::size_t size)
 {
     if (::flock(mDescriptor, LOCK_EX | LOCK_NB) != 0)
-        return; // another process is at it; this line still goes to the full file
-    // Between the look at the size and the lock, another process may have been through with it.
+        return; // another process is rotating the files; this line still goes into the full one
+    // Another process may have rotated the files after the size was read and before the lock was taken.
     if (isThatOfPath() && isFullWith(size) && !moveAside() && ::ftruncate(mDescriptor, 0) != 0)
         errno = 0;
     if (isThatOfPath()) {
         ::flock(mDescriptor, LOCK_UN);
         return;
     }
-    close(); // gives the lock back
+    close(); // also releases the lock
     open();
 }
 

@@ -1,29 +1,29 @@
-// One log file of the appliance, to which several processes append whole lines.
-//
-// A file that has reached its size gets a number behind its name, ".1", and the older ones the next; four old
-// files are kept. Whoever fills the file does this, under a lock on it that nobody waits for; the others
-// notice that the name stands for another file and open that. A file that cannot be renamed is emptied
-// instead, so that a log never fills the disk. Any thread.
 #pragma once
 
 #include <mutex>
 #include <string>
 #include <string_view>
 
+// One log file of the appliance, to which several processes append whole lines.
+//
+// A full file is renamed to ".1", and the older ones to the next number; four old files are kept. The process
+// that fills the file does this under a lock, for which no process waits; the other processes notice that the
+// path leads to another file and open that. If a file cannot be renamed it is emptied, so that a log never
+// fills the disk. Any thread.
 class LogFile
 {
 public:
     static constexpr long long MAX_BYTES = 1000000;
     static constexpr int OLD_FILES = 4;
 
-    // Makes the file, which only its owner may write and his group read. A link, a pipe or a device at this
-    // path is left alone, and lines go nowhere.
+    // Opens or creates the file, which its owner may write and its group may read. If path is a link, a pipe
+    // or a device, it is not touched and all lines are dropped.
     explicit LogFile(std::string path);
     ~LogFile();
     LogFile(const LogFile&) = delete;
     LogFile& operator=(const LogFile&) = delete;
 
-    // Appends a line, which ends with a line feed and holds no other. What cannot be written is lost.
+    // Appends a line, which ends with its only line feed. A line that cannot be written is lost.
     void write(std::string_view line);
 
 private:
@@ -35,6 +35,6 @@ private:
     bool moveAside() const;
 
     std::string mPath;
-    std::mutex mMutex; // of what follows
+    std::mutex mMutex; // guards the members below
     int mDescriptor = -1;
 };

@@ -43,14 +43,14 @@ bool isControl(char32_t c)
     return c < 0x20 || (c >= 0x7F && c < 0xA0);
 }
 
-// Line and paragraph separator, and what turns the direction of writing round.
+// Returns whether c is a line or paragraph separator or changes the text direction.
 bool isMisleading(char32_t c)
 {
     return c == 0x2028 || c == 0x2029 || (c >= 0x202A && c <= 0x202E) || (c >= 0x2066 && c <= 0x2069);
 }
 
-// Texts come from keyboards, files and other processes: none of them may begin a line of its own or steer the
-// terminal on which the log is read.
+// Replaces control characters. Texts come from keyboards, files and other processes and must not start new
+// lines or control the terminal on which the log is read.
 std::wstring escaped(const std::wstring& text)
 {
     std::wstring result;
@@ -74,13 +74,13 @@ std::wstring escaped(const std::wstring& text)
     return result;
 }
 
-// The text as it goes into a line: escaped, in bytes, and no longer than a line can take.
+// Returns the text as it is written: escaped, in bytes, and cut to the limit.
 std::string lineText(const std::wstring& text)
 {
     return wideToMultiByte(escaped(text.size() > TEXT_LIMIT ? text.substr(0, TEXT_LIMIT) : text));
 }
 
-// Puts the arguments into the format, up to a limit.
+// Formats the arguments; the result is cut to a limit.
 __attribute__((format(printf, 1, 0))) std::string formatted(const char* format, va_list args)
 {
     std::string text(FORMATTED_LIMIT, '\0');
@@ -89,7 +89,7 @@ __attribute__((format(printf, 1, 0))) std::string formatted(const char* format, 
     return text;
 }
 
-// Text that becomes part of a printf format must not be read as conversions.
+// Escapes "%" in a text that becomes part of a printf format.
 std::string withoutConversions(const std::string& text)
 {
     std::string result;
@@ -102,7 +102,7 @@ std::string withoutConversions(const std::string& text)
     return result;
 }
 
-// A format cut to size bytes with its NUL, without a conversion that the cut would leave unfinished.
+// Cuts a format to size bytes including its NUL, without leaving an incomplete conversion at the end.
 std::string cutFormat(const std::string& format, std::size_t size)
 {
     if (format.size() < size) {

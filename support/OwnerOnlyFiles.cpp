@@ -2,6 +2,6 @@
 
 void OwnerOnlyFiles::setUmask()
 {
-    const mode_t before = ::umask(REFUSED); // the umask cannot be asked for
+    const mode_t before = ::umask(REFUSED); // the umask can only be read by setting it
     ::umask(before | REFUSED);
 }

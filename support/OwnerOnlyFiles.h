@@ -1,15 +1,15 @@
-// What this process writes can be written by nobody but its owner, whatever umask it was started with.
 #pragma once
 
 #include <sys/stat.h>
 
+// Ensures that only the owner can write the files of this process, whatever umask it was started with.
 namespace OwnerOnlyFiles
 {
 
-// The permissions that no file or folder gets.
+// The permission bits that files and folders never get.
 constexpr mode_t REFUSED = S_IWGRP | S_IWOTH;
 
-// Takes these permissions from every file and folder that the process makes from here on. Call first in main.
+// Adds REFUSED to the umask of the process. Call first in main.
 void setUmask();
 
 } // namespace OwnerOnlyFiles

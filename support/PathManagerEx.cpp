@@ -55,7 +55,7 @@ std::wstring PathManagerEx::getDefaultPath()
     char root[128] = {};
     k2sys_getenv_ac_data(data, sizeof data);
     std::string path = data;
-    // With the file system's root as root path, the data path is taken without its leading "/".
+    // If the root path is "/", the data path is used without its leading "/".
     if (k2sys_getenv_ac_root(root, sizeof root) == 1 && !path.empty())
         path.erase(0, 1);
     return multiByteToWide(path + "/defaultuser/");

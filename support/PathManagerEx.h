@@ -1,12 +1,11 @@
-// Reads the folders from "PathInfo.xml": one element per kind, with a "path" attribute relative to the base
-// path, which is the appliance's data path and "/defaultuser/". Answers are cached for the life of the
-// instance.
 #pragma once
 
 #include "support/IPathManagerEx.h"
 
 #include <mutex>
 
+// Reads the folders from "PathInfo.xml": one element per kind, with a "path" attribute relative to the base
+// path, which is the appliance's data path followed by "/defaultuser/". Answers are cached by the instance.
 class PathManagerEx : public IPathManagerEx
 {
 public:
@@ -39,7 +38,7 @@ public:
     std::wstring getTitlerTemplatesPath() override;
     std::wstring getMoviesPath();
 
-    // The base path, with a final "/".
+    // Returns the base path, with a final "/".
     std::wstring getDefaultPath();
 
 private:
@@ -48,7 +47,7 @@ private:
     static std::string get_uuid();
     static std::string char_to_string(unsigned char byte);
 
-    std::mutex mMutex; // of what follows
+    std::mutex mMutex; // guards the members below
     std::wstring mBasePath;
     std::string mPathFile;
     std::string mScratchPath;

@@ -27,10 +27,10 @@ struct Rename {
     std::string after;
 };
 
-// A folder gets another name now and then; what was on its way to an older name has long arrived.
+// Folders are renamed rarely; writes to a folder older than that many renames have long finished.
 constexpr std::size_t RENAMES_KEPT = 64;
 
-std::mutex gMutex; // guards all of these; the atomic ones are only written with it held
+std::mutex gMutex; // guards all variables below; the atomic ones are read without it
 std::vector<Entry> gEntries;
 std::deque<Rename> gRenames;
 std::function<void()> gListener;
@@ -38,7 +38,8 @@ std::size_t gPictureBytes = 0;
 std::atomic<unsigned long> gVersion = 0;
 std::atomic<std::size_t> gCount = 0;
 std::atomic<unsigned long> gOutages = 0;
-// While this thread tries bytes again: their version. Newer ones may be kept meanwhile, and stay.
+// The version of the bytes that retry() is writing in this thread, else 0. Newer bytes that are kept
+// meanwhile must not be dropped.
 thread_local unsigned long tTriedVersion = 0;
 
 std::string normal(const std::string& path)
@@ -107,7 +108,8 @@ bool take(const std::string& key, std::string& bytes, unsigned long& version)
     return true;
 }
 
-// A picture goes with its title; while the whole folder is away the title may be there under another name.
+// Returns whether the title of a picture was deleted. If its whole folder is missing, the folder may have
+// been renamed, and the title still exists.
 bool isOrphan(const RefusedWrites::File& file)
 {
     return !file.title.empty() && !exists(file.title) && exists(HiddenName::folderOf(file.title));
@@ -175,7 +177,7 @@ std::vector<RefusedWrites::File> RefusedWrites::retry()
     bool isPictureRefused = false;
     for (const File& file : files()) {
         const bool isPicture = !file.title.empty();
-        // Pictures are large, and one is enough to see that there is no room.
+        // Pictures are large: if one does not fit, the others are not tried.
         std::string bytes;
         if ((isPicture && isPictureRefused) || !take(file.path, bytes, tTriedVersion))
             continue;

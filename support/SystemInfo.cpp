@@ -34,7 +34,7 @@ long long kilobytes(long long bytes)
     return bytes < 0 ? -1 : bytes / BYTES_PER_KILOBYTE;
 }
 
-// Files that are in the middle of being saved are no content of their folder.
+// Returns whether the entry is neither temporary nor a kept version, which exist only while a file is saved.
 bool isContent(const fs::path& path)
 {
     return !HiddenName::isHidden(path.filename().native());
@@ -59,7 +59,7 @@ long long folderBytes(const fs::path& folder)
     return sum;
 }
 
-// Whether path is folder or lies below it.
+// Returns whether path is folder itself or below it.
 bool isWithin(const fs::path& folder, const fs::path& path)
 {
     boost::system::error_code error;
@@ -75,13 +75,13 @@ bool copyContents(const fs::path& source, const fs::path& target)
     fs::create_directories(target, error);
     if (error || !fs::is_directory(target, error))
         return false;
-    // Listed before anything is copied, so that a copy into a folder below does not meet itself.
+    // List all entries before copying, so that a copy into a folder below the source does not copy itself.
     std::vector<fs::path> entries;
     for (fs::directory_iterator entry(source, error), end; !error && entry != end; entry.increment(error))
         entries.push_back(entry->path());
     bool isDone = !error;
     for (const fs::path& entry : entries) {
-        // What a link brings in from elsewhere is no content of the folder.
+        // A link that leads out of the folder is not copied.
         const bool isForeign = fs::is_symlink(entry, error) && !isWithin(source, entry);
         if (isContent(entry) && entry != target && !isForeign)
             isDone = SystemInfo::copyFile(entry, target / entry.filename()) && isDone;
@@ -187,8 +187,8 @@ bool SystemInfo::copyFile(const fs::path& source, const fs::path& target)
         fs::create_directories(target.parent_path(), error);
     if (!AtomicFile::copy(source.native(), target.native()))
         return false;
-    // A copied picture stays as old beside its copied title as the original is, whatever the order of
-    // copying: one that is older than its title is made again.
+    // The copied picture keeps its age relative to its copied title, whatever the order of copying: a picture
+    // older than its title would be generated again.
     const std::time_t written = fs::last_write_time(source, error);
     if (!error)
         fs::last_write_time(target, written, error);

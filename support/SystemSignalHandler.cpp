@@ -25,7 +25,7 @@ struct SignalText {
     const char* text;
 };
 
-// Ended by number 0.
+// The entry with number 0 ends the list.
 const SignalText SIGNALS[] = {
     {SIGSEGV, "Segmentation Fault"},
     {SIGBUS, "Bus Error"},
@@ -54,7 +54,8 @@ std::atomic<const char**> g_SignalMsgTable{nullptr};
 std::atomic<int> g_wakeUpWriteEnd{-1};
 std::atomic<bool> g_isTerminationRequested{false};
 
-// The table lies in pages of its own: the fault handler frees it, and the heap may be what is broken there.
+// Allocates the table in pages of its own: the fault handler frees it and cannot rely on the heap, which may
+// be corrupt then.
 const char** allocateTable()
 {
     void* pages = mmap(nullptr, TABLE_BYTES, PROT_READ | PROT_WRITE, MAP_PRIVATE | MAP_ANONYMOUS, -1, 0);
@@ -78,8 +79,8 @@ void callBack()
     }
 }
 
-// Termination requests do blocking work, which a signal handler must not; a pipe carries them to the event
-// loop.
+// Termination requests do blocking work, which is not allowed in a signal handler; a pipe passes them to the
+// event loop.
 void createWakeUpPipe()
 {
     if (QCoreApplication::instance() == nullptr || g_wakeUpWriteEnd.load() != -1) {
@@ -114,13 +115,13 @@ void requestTermination()
     }
     const int savedError = errno;
     const char byte = 1;
-    // A full pipe already holds a request.
+    // If the pipe is full, a request is pending already.
     [[maybe_unused]] const ssize_t written = write(writeEnd, &byte, 1);
     errno = savedError;
 }
 
-// From here on down to handleSignal, only what may be called in a signal handler is called: the fault may
-// have come with any lock held and the heap in any state.
+// The functions from here to handleSignal call only async-signal-safe functions: the fault may have happened
+// with any lock held and with a corrupt heap.
 
 void setDefaultAction(int number)
 {
@@ -131,7 +132,7 @@ void setDefaultAction(int number)
     sigaction(number, &action, nullptr);
 }
 
-// A trace that waits for a lock of the thread that it stopped ends the process all the same.
+// Ends the process even if the trace deadlocks on a lock that the interrupted thread holds.
 void limitTraceTime()
 {
     setDefaultAction(SIGALRM);
@@ -163,7 +164,7 @@ void traceAndAbort()
     std::abort();
 }
 
-// The signal ends the process when the handler returns.
+// The process ends by the signal when the handler returns.
 void traceAndEnd(int number)
 {
     trace();

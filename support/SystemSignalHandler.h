@@ -1,16 +1,15 @@
-// What the process does on signals: faults and aborts leave a stack trace and end it, termination requests
-// call back.
+// Handling of signals: faults and aborts write a stack trace and end the process, termination requests call a
+// function.
 #pragma once
 
-// Installs the handler of the twelve signals, and a stack for it in the calling thread; other threads that
-// want a trace also when their stack is full take one with AlternateStack. callback is called on SIGTERM and
-// SIGINT: from the event loop of the thread that registered when a QCoreApplication exists there, and from
-// within the signal handler otherwise. Null is allowed. A second call replaces callback and name. Call from
-// the GUI thread.
+// Installs the handler for the twelve signals, and an alternate stack in the calling thread; other threads
+// that want a trace even after a stack overflow use AlternateStack. callback is called on SIGTERM and SIGINT:
+// from the event loop of the calling thread if a QCoreApplication exists, otherwise from the signal handler.
+// It may be null. A second call replaces callback and name. Call from the GUI thread.
 void registerSystemSignalHandler(void (*callback)(), char const* processName);
 
-// Whether SIGTERM or SIGINT has come, for waits that hold the event loop up. Any thread.
+// Returns whether SIGTERM or SIGINT was received; for waits that block the event loop. Any thread.
 bool isTerminationRequested();
 
-// The handler itself.
+// The signal handler itself.
 void handleSignal(int signalNumber);

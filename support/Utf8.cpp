@@ -11,7 +11,7 @@ bool isContinuation(unsigned char byte)
     return (byte & 0xC0) == 0x80;
 }
 
-// Length of the well-formed sequence at p, whose lead byte is not ASCII; 0 when there is none.
+// Returns the length of the well-formed multi-byte sequence at p, or 0 if there is none.
 int sequenceLength(const unsigned char* p, const unsigned char* end)
 {
     const unsigned char lead = *p;

@@ -1,4 +1,3 @@
-// The cursor over a TinyXML document.
 #pragma once
 
 #include "support/IXMLLoader.h"
@@ -8,6 +7,7 @@
 class TiXmlDocument;
 class TiXmlElement;
 
+// Implements IXMLLoader on a TinyXML document.
 class XMLLoader : public IXMLLoader
 {
 public:
@@ -25,12 +25,12 @@ public:
     bool createEmptyXML(const std::string& path) override;
 
 private:
-    // Depth first: the element itself, then its first child, then its siblings.
+    // Searches depth first: the element itself, then its first child, then its siblings.
     static bool GetPointerByNodeName(TiXmlElement* element, const std::string& name, TiXmlElement*& out);
     static std::string getAttributeFromNode(TiXmlElement* element, const std::string& node,
                                             const std::string& key);
 
     std::unique_ptr<TiXmlDocument> mDocument;
-    TiXmlElement* mRoot;    // in mDocument
-    TiXmlElement* mCurrent; // in mDocument
+    TiXmlElement* mRoot;    // owned by mDocument
+    TiXmlElement* mCurrent; // owned by mDocument
 };

@@ -15,11 +15,11 @@ namespace
 
 constexpr std::string_view BYTE_ORDER_MARK = "\xEF\xBB\xBF";
 
-// TinyXML writes a byte order mark again that it read, but does not tell of it: the document's user data
-// does.
+// TinyXML writes a byte order mark that it has read, but has no getter for it. The address of this variable
+// as user data marks such a document.
 char gMarked;
 
-// Line ends become single line feeds.
+// Replaces all line ends by single line feeds.
 void normaliseLineEnds(std::string& bytes)
 {
     std::size_t from = bytes.find('\r');
@@ -38,9 +38,8 @@ void normaliseLineEnds(std::string& bytes)
     bytes.resize(to);
 }
 
-// Writes a document as TinyXML prints it. Elements and their attributes, of which the files consist, are
-// written here, without TinyXML's formatted output for every attribute; the rare other nodes print
-// themselves.
+// Writes a document as TinyXML prints it. Elements and attributes are written here, which avoids TinyXML's
+// formatted output for every attribute; other nodes are rare and print themselves.
 class Printer
 {
 public:
@@ -116,8 +115,8 @@ private:
         mBytes += quote;
     }
 
-    // As TiXmlBase::EncodeString, but for "&#x" in a text, which that one writes as it stands and no reader
-    // would read back.
+    // As TiXmlBase::EncodeString, except for "&#x" in a text: TinyXML writes that unescaped, and no reader
+    // could read it back.
     void append(const std::string& text)
     {
         static constexpr char DIGITS[] = "0123456789ABCDEF";
@@ -178,7 +177,7 @@ bool XmlFile::load(const std::string& path, TiXmlDocument& document)
     document.ClearError();
     document.SetUserData(bytes.starts_with(BYTE_ORDER_MARK) ? &gMarked : nullptr);
     document.SetValue(path);
-    document.SetTabSize(0); // nobody asks for the line and column of an element
+    document.SetTabSize(0); // not needed here: line and column of elements
     // The bytes are UTF-8 whatever the declaration says. As another encoding TinyXML would make one byte of
     // each character reference, a NUL of some.
     document.Parse(bytes.c_str(), nullptr, TIXML_ENCODING_UTF8);
@@ -195,7 +194,7 @@ std::string XmlFile::toBytes(const TiXmlDocument& document)
     Printer printer;
     printer.print(document);
     std::string bytes = printer.take();
-    // Bytes that are not UTF-8 would make the file unreadable from here on.
+    // Invalid UTF-8 would make the file unreadable.
     if (!Utf8::isValid(bytes))
         bytes = Utf8::repaired(bytes);
     return bytes;

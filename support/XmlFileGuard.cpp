@@ -10,7 +10,7 @@
 namespace
 {
 
-// Follows the structure of a document as TinyXML reads it. The bytes are those up to the first NUL.
+// Follows the structure of a document as TinyXML reads it. Expects the bytes up to the first NUL.
 class StructureScan
 {
 public:
@@ -47,7 +47,7 @@ private:
         return isNameStart(c) || (c >= '0' && c <= '9') || c == '-' || c == '.' || c == ':';
     }
 
-    // TinyXML skips byte order marks and the non-characters U+FFFE and U+FFFF like blanks.
+    // TinyXML skips byte order marks and the non-characters U+FFFE and U+FFFF like white space.
     void skipSpace()
     {
         for (;;) {
@@ -73,7 +73,7 @@ private:
                std::memcmp(mPos, tag.data(), tag.size()) == 0;
     }
 
-    // Moves behind the next occurrence of a byte, or to the end and false when there is none.
+    // Moves behind the next occurrence of a byte; returns false, at the end, if there is none.
     bool skipPast(char byte)
     {
         const auto* found =
@@ -93,8 +93,8 @@ private:
         return false;
     }
 
-    // For a character reference without digits or end TinyXML looks ahead past quotes and tags, and would see
-    // another structure than this scan.
+    // Refuses character references without digits or without an end: TinyXML searches for the end beyond
+    // quotes and tags and would see another structure than this scan.
     bool hasGoodReferences(const char* p, const char* end) const
     {
         if (!mHasReferences)
@@ -113,7 +113,8 @@ private:
         return true;
     }
 
-    // What has no UTF-8 would make a file unreadable that it is saved to; a NUL would end a name.
+    // Refuses values that are not characters, which would make the saved file unreadable, and NUL, which
+    // would end a name.
     static bool isCharacter(std::string_view digits, int base)
     {
         std::uint32_t code = 0;
@@ -126,7 +127,7 @@ private:
         return (c >= '0' && c <= '9') || (c >= 'a' && c <= 'f') || (c >= 'A' && c <= 'F');
     }
 
-    // Outside the root TinyXML ends quietly at the first thing that is no markup.
+    // Outside the root element, TinyXML stops without an error at the first text.
     bool scanTopLevel()
     {
         skipSpace();
@@ -158,7 +159,7 @@ private:
             ++mPos;
             return scanElement();
         }
-        // What is left open at the end of the file stays without effect outside the root.
+        // An unterminated construct at the end of the file has no effect outside the root element.
         if (startsWithIgnoringCase("<?xml"))
             return scanDeclaration();
         if (startsWith("<!--")) {
@@ -185,7 +186,7 @@ private:
             }
             if (startsWithIgnoringCase("version") || startsWithIgnoringCase("encoding") ||
                 startsWithIgnoringCase("standalone")) {
-                if (!scanAttribute()) { // TinyXML ends here, and is content outside the root
+                if (!scanAttribute()) { // TinyXML stops here, which is an error only inside the root element
                     mIsDone = true;
                     return mDepth == 0;
                 }

@@ -14,8 +14,8 @@ class QPainter;
 class QTimer;
 class QWidget;
 
-// A balloon of its own by a widget: what a button does, under it, or a prompt above what it is about. It goes
-// by hide(), with the widget, or after its time. GUI thread only.
+// A balloon beside a widget. It shows the purpose of a button below it, or a prompt above the widget that the
+// prompt refers to. It is hidden by hide(), together with the widget, or after its time. GUI thread only.
 class Balloon : public QObject
 {
     Q_OBJECT
@@ -23,18 +23,19 @@ public:
     explicit Balloon(QObject* parent = nullptr);
     ~Balloon() override;
 
-    static constexpr int FONT_SIZE = 29; // pixels
-    // Bounds the balloons and owns their windows; null: the screen does.
+    static constexpr int FONT_SIZE = 29; // in pixels
+    // Limits the positions of balloons and is the parent of their windows. If null, the screen is the limit.
     static QWidget* s_ParentWindow;
 
-    // One line under the button, arrow up; above it where there is no room. An empty text hides the balloon.
+    // Shows one line below the button with the arrow up, or above it if there is no room. An empty text hides
+    // the balloon.
     void showButtonText(QWidget* button, const QString& text);
-    // One or more lines above the widget, arrow down; under it where there is no room. milliseconds: how long
-    // it stays, 0 until hide().
+    // Shows one or more lines above the widget with the arrow down, or below it if there is no room. Hidden
+    // after that many milliseconds; 0 for not before hide().
     void showPromptText(QWidget* widget, const QString& text, int milliseconds = 0);
     void hide();
     bool isVisible() const;
-    // Where it stands, in global coordinates.
+    // Returns the rectangle of the balloon in global coordinates.
     QRect geometry() const;
 
 protected:

@@ -38,7 +38,7 @@ void paintBand(QPainter& painter, const SliceFrame& frame, const QRect& body, in
     frame.paintPiece(painter, piece(1),
                      QRect(x + arrow.width(), center.y(), center.x() + center.width() - x - arrow.width(),
                            center.height()));
-    // The picture's inner edge lies on the band's.
+    // Align the inner edge of the arrow's picture with that of the band.
     const int y = line == 0 ? center.y() + center.height() - arrow.height() : center.y();
     painter.drawPixmap(x, y, arrow);
 }

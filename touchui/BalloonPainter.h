@@ -7,18 +7,18 @@
 
 class QPainter;
 
-// The three bands of a balloon, each of three pictures, with the picture that carries the arrow in the middle
-// of the upper or the lower one. The arrow's picture is higher than its band and reaches out of the body.
+// Paints balloons in three bands of three pictures each; the arrow's picture replaces the middle picture of
+// the upper or lower band. It is higher than its band and extends beyond the body.
 namespace BalloonPainter
 {
 
-// The frame of the family ":/ToolTip/Balloon_Common_", and its arrows.
+// The pictures of the family ":/ToolTip/Balloon_Common_": the frame and its arrows.
 SliceFrame frame();
 QPixmap arrowUp();
 QPixmap arrowDown();
 
-// One band, over the body's width: the arrow centred on arrowX where there is one; line is 0 upper, 1 middle,
-// 2 lower.
+// Paints one band over the width of the body, with the arrow, if there is one, centred on arrowX. line is 0
+// for the upper band, 1 for the middle, 2 for the lower.
 void paintBand(QPainter& painter, const SliceFrame& frame, const QRect& body, int line,
                const QPixmap& arrow = QPixmap(), int arrowX = 0);
 

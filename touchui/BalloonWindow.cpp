@@ -18,7 +18,7 @@ void BalloonWindow::showPicture(const QPixmap& picture, const QPoint& globalPosi
 {
     m_picture = picture;
     setGeometry(QRect(globalPosition, picture.size()));
-    // Without a compositor what is transparent would be black.
+    // Without a compositor, transparent pixels would be black.
     setMask(picture.mask());
     if (!isVisible()) {
         show();

@@ -5,19 +5,19 @@
 #include <QPixmap>
 #include <QWidget>
 
-// The small window of a balloon: it shows one picture, takes no touch, mouse or focus, and lies above
-// everything.
+// The window of a balloon: shows one picture above all other windows and accepts no touch, mouse or focus.
 class BalloonWindow : public QWidget
 {
     Q_OBJECT
 public:
-    // window bounds the placement and is the parent; null: the screen does.
+    // window limits the placement and is the parent. If null, the screen is the limit.
     explicit BalloonWindow(QWidget* window);
 
-    // Shows the picture at the global place. Its transparent pixels are no part of the window.
+    // Shows the picture at a global position. Its transparent pixels are not part of the window.
     void showPicture(const QPixmap& picture, const QPoint& globalPosition);
 
-    // In global coordinates: the window's rectangle, or that of the screen at the point.
+    // Returns the rectangle of the window, or of the screen at the point if window is null, in global
+    // coordinates.
     static QRect bounds(const QWidget* window, const QPoint& globalPoint);
 
 protected:

@@ -7,28 +7,28 @@
 class QGraphicsTextItem;
 class QGraphicsView;
 
-// The text that is edited on a canvas. The graphics view has the input focus, and keeps the keyboard also
-// while no text of it is edited.
+// The text that is being edited on a canvas. The graphics view has the input focus; the keyboard stays open
+// even while no text is being edited.
 class CanvasTextField : public InputField
 {
 public:
-    // What QGraphicsItem::type() is of the texts of a canvas.
+    // The QGraphicsItem::type() of the texts of a canvas.
     static constexpr int ITEM_TYPE = QGraphicsItem::UserType + 10;
 
-    // The text that is edited: enabled, with text editor interaction, and the child of another item. Null
-    // when there is none.
+    // Returns the text that is being edited: enabled, with text editor interaction, and a child of another
+    // item. Null if there is none.
     static QGraphicsTextItem* editedText(const QGraphicsView& view);
 
     explicit CanvasTextField(QGraphicsView& view) : m_view(view) {}
 
-    // What the text's object name says.
+    // Returns the contents of the text's object name.
     SubCommonDefine::tagSoftKeyBoardInitData describe() const override;
     bool keepsKeyboard() const override { return true; }
-    // Inserts at the cursor.
+    // Inserts the text at the cursor.
     void enter(const QString& text) override;
-    // Always true: whatever is typed is in the text already.
+    // Always true: typed text is already in the item.
     bool judge(const QString&) override { return true; }
-    // Sends the text a KSSoftKeyboardCursorSettingEvent.
+    // Sends a KSSoftKeyboardCursorSettingEvent to the text.
     void select(const SubCommonDefine::tagSoftKeyBoardKeyTextSelectionPos& pos) override;
     QObject* keyReceiver() override;
     QObject* closeReceiver() override;

@@ -7,7 +7,7 @@ ComboBoxField::ComboBoxField(QComboBox& box) : LineEditField(*box.lineEdit()), m
 {
 }
 
-// The box, as a rule: its owner may have given the line edit another parent.
+// Normally returns the box; its owner may have given the line edit another parent.
 QObject* ComboBoxField::closeReceiver()
 {
     return m_box.lineEdit()->parent();

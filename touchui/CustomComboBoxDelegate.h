@@ -3,7 +3,7 @@
 #include <QAbstractItemDelegate>
 #include <QPixmap>
 
-// Paints the rows of a combo box's list: the cursor behind the chosen or pressed row, an icon, the text.
+// Paints the rows of a combo box's list: the cursor behind the current or pressed row, an icon, the text.
 class CustomComboBoxDelegate : public QAbstractItemDelegate
 {
     Q_OBJECT
@@ -13,8 +13,8 @@ public:
     static constexpr int ROW_HEIGHT = 56;
     static constexpr int TEXT_MARGIN = 14;
 
-    // A row shows a field of its colour: that of Qt::BackgroundRole, else of Qt::DecorationRole, else the one
-    // that its text names.
+    // If on, each row shows a rectangle in its colour: that of Qt::BackgroundRole, else of
+    // Qt::DecorationRole, else the colour that its text names.
     void setColorPallete(bool on) { m_colorPallete = on; }
     bool colorPallete() const { return m_colorPallete; }
 
@@ -22,11 +22,11 @@ public:
                const QModelIndex& index) const override;
     QSize sizeHint(const QStyleOptionViewItem& option, const QModelIndex& index) const override;
 
-    // The invalid colour for a row without one.
+    // Returns an invalid colour for a row without a colour.
     static QColor rowColor(const QModelIndex& index);
 
 protected:
-    // The cursor behind the chosen or pressed row; whether the row is enabled.
+    // Paints the cursor behind the current or pressed row. Returns whether the row is enabled.
     bool paintCursor(QPainter* painter, const QStyleOptionViewItem& option, const QModelIndex& index) const;
 
 private:

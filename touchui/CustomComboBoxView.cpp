@@ -11,7 +11,7 @@
 namespace
 {
 
-// Without arrows: the bar is all track and handle.
+// Without arrow buttons: the bar consists only of the track and the handle.
 const char LIST_STYLE[] = "QListView { background: transparent; border: 0px; }"
                           "QScrollBar { margin: 0px; border: 0px; background-color: rgb(51, 51, 51) }"
                           "QScrollBar:vertical { width: 32px }"
@@ -164,7 +164,7 @@ bool CustomComboBoxView::viewportMouseEvent(QEvent* event)
     const auto* mouse = static_cast<QMouseEvent*>(event);
     const QPoint position = mouse->position().toPoint();
     if (m_finger.isDown()) {
-        return true; // a finger has the list
+        return true; // a finger is using the list
     }
     if (event->type() == QEvent::MouseMove) {
         if (mouse->buttons() & Qt::LeftButton) {

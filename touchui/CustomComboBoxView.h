@@ -9,15 +9,15 @@
 
 class QTouchEvent;
 
-// The list of a combo box, for one finger: it follows the finger, runs on after it and takes a tap as a
-// choice. The mouse drags and taps it the same way. Points are in viewport coordinates.
+// The list of a combo box, operated with one finger: a drag scrolls it, a flick lets it glide, and a tap
+// chooses a row. The mouse works in the same way. Points are in viewport coordinates.
 class CustomComboBoxView : public QListView
 {
     Q_OBJECT
 public:
     explicit CustomComboBoxView(QWidget* parent = nullptr);
 
-    // The row under a finger that may yet become a tap; invalid otherwise.
+    // Returns the row under a press that may still become a tap; invalid otherwise.
     QModelIndex pressedIndex() const { return m_pressedIndex; }
 
     virtual bool onTouchEvent(QTouchEvent* event);
@@ -25,11 +25,11 @@ public:
     virtual void onTouchUpdateEvent(QTouchEvent* event);
     virtual void onTouchEndEvent(QTouchEvent* event);
 
-    // A finger's life; the mouse lives it, too.
+    // Report the steps of a press, by a finger or the mouse.
     void pressAt(const QPoint& position);
     void moveTo(const QPoint& position);
     void releaseAt(const QPoint& position);
-    // Ends it without a tap and without a flick.
+    // Ends the press without a tap and without a flick.
     void cancelTouch();
 
     virtual void setAutoFlick(bool on) { m_flicker.setGliding(on); }
@@ -39,15 +39,15 @@ public:
     virtual bool hasFlicked() const { return m_flicker.hasFlicked(); }
     virtual void stopFlick() { m_flicker.stop(); }
     virtual bool isAutoFilck() const { return m_flicker.isGliding(); }
-    // By how much the list moves in this tick; the start point moves along.
+    // Returns the distance by which the list moves in this tick, and advances the start point.
     virtual QPoint getDistance();
     virtual QPoint getFlickDistance() { return FlickMotion::pixels(m_flicker.glide()); }
     virtual QPoint getDragDistance() { return FlickMotion::pixels(m_flicker.drag()); }
-    // A positive offset moves the rows down.
+    // Moves the rows down by offset pixels.
     virtual void changeScrollBarValue(int offset);
 
 Q_SIGNALS:
-    // An enabled row was tapped.
+    // Emitted when an enabled row was tapped.
     void signalTapped(const QModelIndex& index);
 
 protected:
@@ -55,7 +55,7 @@ protected:
     void paintEvent(QPaintEvent* event) override;
     void keyPressEvent(QKeyEvent* event) override;
     void hideEvent(QHideEvent* event) override;
-    // Rules a line under the row; rect is the row's.
+    // Draws a line at the bottom of a row; rect is that of the row.
     virtual void drawSeparator(QPainter& painter, const QRect& rect);
 
 private:

@@ -49,7 +49,7 @@ void CustomTreeDelegete::setEditorData(QWidget* editor, const QModelIndex& index
 {
     if (auto* line = qobject_cast<QLineEdit*>(editor)) {
         const QString text = index.data(Qt::EditRole).toString();
-        // Data of the row can change while its name is being typed.
+        // Data of the row can change while its name is being edited.
         if (!line->isModified() && line->text() != text) {
             line->setText(text);
         }

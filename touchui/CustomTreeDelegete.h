@@ -5,7 +5,7 @@
 class KSTreeView;
 class QLineEdit;
 
-// Paints the cells of a KSTreeView through its style and opens the editors that the model's factory makes.
+// Paints the cells of a KSTreeView with its style and opens the editors that the model's factory creates.
 class CustomTreeDelegete : public QStyledItemDelegate
 {
     Q_OBJECT
@@ -19,15 +19,15 @@ public:
     QWidget* createEditor(QWidget* parent, const QStyleOptionViewItem& option,
                           const QModelIndex& index) const override;
     void setEditorData(QWidget* editor, const QModelIndex& index) const override;
-    // Commits the text of a line edit; other editors are left to the base.
+    // Commits the text of a line edit; the base class handles other editors.
     void setModelData(QWidget* editor, QAbstractItemModel* model, const QModelIndex& index) const override;
     void updateEditorGeometry(QWidget* editor, const QStyleOptionViewItem& option,
                               const QModelIndex& index) const override;
 
 Q_SIGNALS:
-    // A line edit was opened on the cell and has not got its text yet.
+    // Emitted when a line edit was opened in the cell, before its text is set.
     void signalLineEditInitialize(QLineEdit* editor, const QModelIndex& index) const;
-    // Its text was committed; the model has it.
+    // Emitted when the text was committed to the model.
     void signalLineEditCommitted(const QString& text, const QModelIndex& index) const;
 
 protected:

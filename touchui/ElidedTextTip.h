@@ -4,18 +4,19 @@
 #include <QRect>
 #include <QTimer>
 
-// The balloon with a name that its row shows shortened; it leaves by itself. GUI thread only.
+// Shows a balloon with the full text of a name that its row shows elided. The balloon hides after a time. GUI
+// thread only.
 class ElidedTextTip : public QObject
 {
     Q_OBJECT
 public:
     ElidedTextTip();
 
-    // row is global; textWidth is what the row has for the name, in pixels.
+    // row is in global coordinates; textWidth is the width in pixels that the row has for the name.
     void show(const QRect& row, const QString& text, int textWidth);
-    // Hides the balloon that this object shows; another's stays.
+    // Hides the balloon if it was shown by this object.
     void hide();
-    // Starts its time once more, if it shows.
+    // Restarts the time until the balloon hides, if it is visible.
     void restartIfActive();
 
 private:

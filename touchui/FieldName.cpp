@@ -35,7 +35,7 @@ QString FieldName::write(const tagSoftKeyBoardInitData& data)
     return parts.join(SEPARATOR);
 }
 
-// The text in the middle may hold the separator itself.
+// The text, which is in the middle, may contain separators itself.
 void FieldName::read(const QString& name, tagSoftKeyBoardInitData& data)
 {
     const QStringList parts = name.split(SEPARATOR);

@@ -9,7 +9,7 @@ namespace FlickMotion
 namespace
 {
 
-// Far more than any screen, and far less than what overflows in sums.
+// Far larger than any screen, and small enough that sums do not overflow.
 constexpr qreal FARTHEST = 1000000.0;
 
 qreal sane(qreal value)

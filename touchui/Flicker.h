@@ -10,60 +10,61 @@
 
 class QAbstractScrollArea;
 
-// Lets a list follow a finger and run on after it, by the arithmetic of FlickMotion.
+// Lets a list follow a finger and glide on after it, with the arithmetic of FlickMotion.
 //
-// While there is way between the start point and the end point, ticked() comes at each interval, and the list
-// scrolls by advance(). The motion ends when there is no way left, or at an end of the list. Points are in
-// one coordinate space of the list's choice, pixels. GUI thread only.
+// While the start point and the end point differ, ticked() is emitted at each interval, and the list scrolls
+// by advance(). The motion stops when they meet, or at an end of the list. Points are in pixels, in a
+// coordinate space that the list chooses. GUI thread only.
 class Flicker : public QObject
 {
     Q_OBJECT
 public:
-    // What a motion ends with. Rest: the list is where the finger is. Glide: it has run on after the finger.
-    // Limit: it shows its first or its last row.
+    // How a motion has ended. Rest: the list has reached the finger. Glide: it has stopped after a flick.
+    // Limit: it has reached its first or last row.
     enum class End { Rest, Glide, Limit };
 
-    // The list is not owned and must outlive this object, of which it is usually the owner. Its vertical
-    // scroll bar gives the limits.
+    // The list, which is usually the owner of this object, must outlive it. Its vertical scroll bar provides
+    // the limits.
     Flicker(const QAbstractScrollArea* list, const FlickMotion::Rules& rules);
 
-    // A finger comes down: stops what moves, and allows the list to follow.
+    // Call when a finger comes down: stops any motion and enables following.
     void begin(const QPointF& position);
-    // Moves and lifts are ignored without a finger.
+    // Ignored, like lift(), if no finger is down.
     void follow(const QPointF& position);
-    // Lets the list run on when there is way left, unless the bounds have cut the last tick short.
+    // Call when the finger is lifted: the list glides if there is a distance left, unless the bounds have
+    // reduced the last step.
     void lift(const QPointF& position);
-    // The finger counts no more, and nothing moves.
+    // Stops following and any motion.
     void cancel();
     bool isFollowing() const { return m_following; }
-    // Whether the finger has left the room of a tap, measured straight.
+    // Returns whether the finger has moved further than a tap allows (Euclidean distance).
     bool isMove() const { return FlickMotion::isMove(m_press, m_current); }
 
     void setStart(const QPointF& point);
-    // Starts the motion when there is way to the point and it does not run. Ignored when the list may not
-    // follow.
+    // Moves the end point and starts the motion if necessary. Ignored while following is disabled.
     void setEnd(const QPointF& point);
-    // Whether there is no way left.
+    // Returns whether no distance is left.
     bool isEnd() const { return FlickMotion::isFlickEnd(m_rules, m_start, m_end); }
-    // Forgets the way that is left.
+    // Discards the distance that is left.
     void rest() { setStart(m_end); }
-    // Stops the motion at once; ended() does not come.
+    // Stops the motion at once, without ended().
     void stop();
     bool isRunning() const { return m_timer.isActive(); }
 
-    // One tick: moves the start point and returns by how much the content moves. drag() with the finger down,
-    // glide() after it; advance() is the one that it is time for. The bounds matter to a drag.
+    // Calculate one tick: move the start point and return the distance by which the content moves. drag() is
+    // for a finger that is down, glide() for the time after the lift; advance() selects between them. The
+    // bounds apply only to a drag.
     QPointF advance(const std::optional<FlickMotion::DragBounds>& bounds = std::nullopt);
     QPointF drag(const std::optional<FlickMotion::DragBounds>& bounds = std::nullopt);
     QPointF glide();
 
-    // Whether the list runs on after the finger.
+    // Returns whether the list glides after the lift.
     bool isGliding() const { return m_gliding; }
     void setGliding(bool gliding) { m_gliding = gliding; }
-    // Whether the list may follow. False stops it.
+    // Whether following is enabled. Disabling it stops the motion.
     bool isAble() const { return m_able; }
     void setAble(bool able);
-    // Whether the list has moved since the start point was set.
+    // Returns whether the list has moved since the start point was set.
     bool hasFlicked() const { return m_hasFlicked; }
 
 Q_SIGNALS:
@@ -85,9 +86,9 @@ private:
     QPointF m_press;
     QPointF m_current;
     bool m_following = false;
-    bool m_pendingStart = false; // the first move sets the start point once more
+    bool m_pendingStart = false; // the first move sets the start point again
     bool m_gliding = false;
     bool m_able = true;
     bool m_hasFlicked = false;
-    bool m_bounded = false; // the last tick was cut short
+    bool m_bounded = false; // the bounds have reduced the last step
 };

@@ -6,9 +6,9 @@
 
 class TitlerToolFactory;
 
-// The way of the touch locks to the appliance's other processes. The application installs its controller with
-// setInstance; until then, and after it was deleted, getInstance() is null and locks stay inside this
-// process. Signals are emitted in the GUI thread.
+// Exchanges touch lock events with the appliance's other processes. The application installs its controller
+// with setInstance; before that, and after the controller was deleted, getInstance() is null and locks are
+// local to this process. Signals are emitted in the GUI thread.
 class ITitlerAPPEventFilterController : public QObject
 {
     Q_OBJECT
@@ -21,15 +21,16 @@ public:
     static void setInstance(ITitlerAPPEventFilterController* instance);
 
     virtual void initialize(TitlerToolFactory* factory) = 0;
-    // Announces a lock of this process (LOCKTYPE_TOUCH) or the use of a transient control (LOCKTYPE_OBJECT).
+    // Announces a touch lock of this process (LOCKTYPE_TOUCH) or the use of a transient control
+    // (LOCKTYPE_OBJECT).
     virtual void sendAPPEvent(APPEventDefine::LOCKTYPE type, bool on) = 0;
-    // Asks the other processes to give way.
+    // Asks the other processes to release their locks.
     virtual void informRestoreOriginal(APPEventDefine::EventRevicer receiver) = 0;
 
 Q_SIGNALS:
-    // Another process has locked or unlocked.
+    // Emitted when another process has locked or unlocked.
     void signalSendAPPEvent(APPEventDefine::_tagAPPEvent event);
-    // Another process asks this one to give way: close what is open.
+    // Emitted when another process asks this one to close its transient controls.
     void signalRestoreOriginal();
     void signalRestoreFocus();
 };

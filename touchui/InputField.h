@@ -8,15 +8,16 @@ class QObject;
 class QString;
 class QWidget;
 
-// What the soft keyboard fills: describes itself to the keyboard and takes what the operator has typed there.
-// An object of this class lives for one call, and so long the widget must. GUI thread only.
+// A field that is filled with the soft keyboard: describes itself to the keyboard and receives the typed
+// text. An object of this class is used for a single call, during which the widget must exist. GUI thread
+// only.
 class InputField
 {
 public:
-    // The field that a widget with the input focus is or shows: a line edit, the line edit of a combo box or
-    // the text that is edited in a graphics view. Null for null and for other widgets.
+    // Returns the field for a widget with the input focus: a line edit, the line edit of a combo box, or the
+    // text that is being edited in a graphics view. Null for null and for other widgets.
     static std::unique_ptr<InputField> of(QWidget* widget);
-    // The object as a widget when it takes text, else null.
+    // Returns the object as a widget if it accepts text, else null.
     static QWidget* takerOfText(QObject* object);
 
     InputField() = default;
@@ -25,18 +26,18 @@ public:
     InputField& operator=(const InputField&) = delete;
 
     virtual SubCommonDefine::tagSoftKeyBoardInitData describe() const = 0;
-    // True when text goes in while it is typed, and the keyboard stays through Enter and changes of focus.
-    // Else the text comes with Enter, which ends the field.
+    // Returns true if text is inserted while it is typed and the keyboard stays open on Enter and on changes
+    // of focus. Otherwise the text is entered with Enter, which closes the keyboard.
     virtual bool keepsKeyboard() const = 0;
-    // Takes a complete text, and logs it as the operator's.
+    // Enters a complete text and logs it as the operator's input.
     virtual void enter(const QString& text) = 0;
-    // Lets the field's validator, and whoever listens to it, judge a text that is still being typed, without
-    // a change of the field. False when the field has no validator to ask.
+    // Has the field's validator check a text that is still being typed, without changing the field; listeners
+    // of the validator are notified. Returns false if the field has no validator.
     virtual bool judge(const QString& text) = 0;
-    // Positions count characters of the field's text and are kept within it.
+    // Positions are character positions in the field's text and are clamped to it.
     virtual void select(const SubCommonDefine::tagSoftKeyBoardKeyTextSelectionPos& pos) = 0;
-    // Where keys of the service go.
+    // Returns the object that receives the key events of the service.
     virtual QObject* keyReceiver() = 0;
-    // What is told that the keyboard was closed under the field. May be null.
+    // Returns the object that is notified when the keyboard was closed. May be null.
     virtual QObject* closeReceiver() = 0;
 };

@@ -67,7 +67,8 @@ KSAppEventFilter::~KSAppEventFilter()
 
 bool KSAppEventFilter::eventFilter(QObject* obj, QEvent* event)
 {
-    // Stands before every event of the application: what concerns nobody leaves on the shortest way.
+    // This runs for every event of the application, so it must be fast for all events that are not handled
+    // here.
     const bool swallowed =
         doEventFilter(obj, event) || (!m_eventFilters.isEmpty() && notifyRegEventFilter(obj, event));
     if (event->type() == QEvent::TouchEnd && isTouched(obj)) {
@@ -108,7 +109,7 @@ bool KSAppEventFilter::doEventFilter(QObject* obj, QEvent* event)
             watchIgnoredTouch(event);
             return false;
         }
-        // The end of a touch that no end will follow.
+        // After a TouchCancel, no TouchEnd follows.
         noticeAcceptedTouch(obj);
         forgetTouch(obj);
         if (isLock(obj, LOCKMETHOD_TOUCH)) {
@@ -127,7 +128,7 @@ bool KSAppEventFilter::doEventFilter(QObject* obj, QEvent* event)
         }
         return false;
     case QEvent::Gesture:
-        return true; // raw touch only
+        return true; // gestures are not used
     default:
         return false;
     }
@@ -138,7 +139,7 @@ bool KSAppEventFilter::notifyRegEventFilter(QObject* obj, QEvent* event)
     if (obj->isWindowType()) {
         return false;
     }
-    // By index: a filter may leave, or be deleted, while it is asked.
+    // Iterates by index, because a filter may unregister or be deleted during the call.
     for (qsizetype i = 0; i < m_eventFilters.size();) {
         QObject* const asked = m_eventFilters.at(i);
         if (asked->eventFilter(obj, event)) {
@@ -209,8 +210,8 @@ int KSAppEventFilter::doLockTouchBegin(QObject* obj, QEvent* event)
     return result;
 }
 
-// A widget that was let through but ignored the begin, such as a window beside its buttons, sees neither
-// updates nor the end. When its finger is lifted from the window, it lets go.
+// A widget that was allowed the touch but ignored its begin, for example a window beside its buttons,
+// receives neither updates nor the end. Its lock is released when the finger is lifted from the window.
 void KSAppEventFilter::watchIgnoredTouch(QEvent* event)
 {
     if (m_begun == nullptr) {
@@ -223,7 +224,8 @@ void KSAppEventFilter::watchIgnoredTouch(QEvent* event)
     if (!lifted) {
         return;
     }
-    // After the widgets have had this event, by which one of them may prove that it accepted the begin.
+    // Queued until the widgets have handled this event, which shows whether one of them has accepted the
+    // begin.
     const auto release = [this, obj = m_begun, id = m_begunId] {
         if (obj != nullptr && obj == m_begun && id == m_begunId) {
             m_begun.clear();
@@ -268,7 +270,7 @@ void KSAppEventFilter::touchedObjectDestroyed(QObject* obj)
     }
 }
 
-// Each of them may destroy others, or begin something new, when it hears of it.
+// Works on a copy, because each cancelled object may destroy others or start a new touch.
 void KSAppEventFilter::cancelTouches(const QWidget* window)
 {
     const QList<QPointer<QObject>> touched(m_touched.cbegin(), m_touched.cend());
@@ -290,7 +292,7 @@ void KSAppEventFilter::cancelTouchWhenDisabled(QObject* obj)
     }
 }
 
-// A child that is hidden by itself may go on with its finger, as a row does that is carried.
+// A child that was hidden explicitly keeps its touch; a row that is being dragged relies on that.
 void KSAppEventFilter::cancelTouchWhenHidden(QObject* obj)
 {
     if (m_touched.isEmpty() || !obj->isWidgetType()) {
@@ -579,7 +581,7 @@ void KSAppEventFilter::notifyRegLockObjects(QObject* obj, KSLockObject* sender, 
     }
 }
 
-// The owned list frees it at the end.
+// Does nothing: all lock objects are deleted by the destructor.
 void KSAppEventFilter::deleteLockObject(KSLockObject*)
 {
 }

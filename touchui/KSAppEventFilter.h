@@ -9,56 +9,56 @@
 
 class QWidget;
 
-// The application-wide gate that decides which object may receive a touch: it is installed on the application
-// object and sees every event first. One object at a time holds the default lock; a touch on any other is
-// swallowed, and so are its updates and its end. Window-level events, which come before those of the widget,
-// pass untouched, except key presses. GUI thread only.
+// Decides for the whole application which object may receive a touch. It is installed on the application
+// object and filters every event first. Only one object at a time holds the default lock; a touch on any
+// other object is swallowed, including its updates and its end. Events of windows (QWindow), which precede
+// those of widgets, are passed on unchanged, except key presses. GUI thread only.
 //
-// An object whose touch was let through never waits for an end that does not come: when a lock breaks its
-// touch, when it is disabled, when its window is hidden or blocked by a dialog, and when the end itself is
-// swallowed, it is sent a QEvent::TouchCancel. A destroyed object gives its lock back.
+// An object whose touch was accepted always receives an end of it: if a lock breaks the touch, the object is
+// disabled, its window is hidden or blocked by a dialog, or the end itself is swallowed, it is sent a
+// QEvent::TouchCancel. The lock of a destroyed object is released.
 class KSAppEventFilter : public QObject
 {
     Q_OBJECT
 public:
-    // The filter that was made last and stands before the application's events; null when there is none.
+    // Returns the filter that was created last; null if there is none.
     static KSAppEventFilter* current();
 
     explicit KSAppEventFilter(QObject* parent = nullptr);
-    // Deletes every lock object that was created here or given to keepNewLockObject.
+    // Deletes every lock object that was created here or passed to keepNewLockObject.
     ~KSAppEventFilter() override;
 
     bool eventFilter(QObject* obj, QEvent* event) override;
 
-    // Makes a lock of the type (or uses the given one) and makes the objects eligible for it. Null on
-    // refusal. The result is owned here, also a given one.
+    // Creates a lock of the type, or uses the given one, and makes the object or objects eligible for it. The
+    // result is owned by this filter. Null on failure.
     virtual KSLockObject* createLockObject(QObject* obj, KSLockObject* lock, LOCKOBJECT_TYPE type,
                                            void* param);
     virtual KSLockObject* createLockObject(QList<QObject*> objs, KSLockObject* lock, LOCKOBJECT_TYPE type,
                                            void* param);
-    // The same, and lets touches ask for it from now on.
+    // As createLockObject; in addition, touches can acquire the lock from now on.
     virtual KSLockObject* registerLockObject(QObject* obj, KSLockObject* lock, LOCKOBJECT_TYPE type,
                                              void* param);
     virtual KSLockObject* registerLockObject(QList<QObject*> objs, KSLockObject* lock, LOCKOBJECT_TYPE type,
                                              void* param);
     virtual int unregisterLockObject(QObject* obj, KSLockObject* lock);
 
-    // The object's eventFilter() is asked for every widget event that passes the gate, in the order of
-    // registration. A deleted object leaves by itself.
+    // Calls the object's eventFilter() for every widget event that this filter passes on, in the order of
+    // registration. A deleted object is unregistered automatically.
     virtual void registerEventFilter(QObject* obj);
     virtual void unegisterEventFilter(QObject* obj);
 
     virtual bool doEventFilter(QObject* obj, QEvent* event);
-    // 0 lets the event pass, 1 swallows it; likewise the next three.
+    // These four return 0 to pass the event on, 1 to swallow it.
     virtual int doLock(QObject* obj, QEvent* event);
     virtual int doLockTouchBegin(QObject* obj, QEvent* event);
     virtual int doLockTouchUpdate(QObject* obj, QEvent* event);
     virtual int doLockTouchEnd(QObject* obj, QEvent* event);
 
-    // 0: accepted; 1: refused.
+    // Return 0 for success, 1 for failure.
     virtual int tryLock(QObject* obj, LOCKMETHOD_TYPE method);
     virtual int tryUnlock(QObject* obj, LOCKMETHOD_TYPE method);
-    // Whether any lock is active; the arguments are not looked at.
+    // Returns whether any lock is active; the arguments are ignored.
     virtual bool isLock(QObject* obj, LOCKMETHOD_TYPE method);
     virtual LOCKMETHOD_TYPE getLockMethod(QEvent* event);
 
@@ -79,28 +79,28 @@ public:
     virtual void addActivateLockObject(QObject* obj, KSLockObject* lock, LOCKMETHOD_TYPE method);
     virtual void removeActivateLockObject(QObject* obj, KSLockObject* lock, LOCKMETHOD_TYPE method);
     virtual void clearActivateLockObject();
-    // The locks that are held now, each with its holders; a forced lock has none.
+    // Returns the active locks with the objects that hold them; a forced lock has none.
     virtual QMap<KSLockObject*, QList<QObject*>> activateLockObjects();
-    // Takes ownership; null is ignored, and so is a lock that is owned already.
+    // Takes ownership. Ignores null and locks that are owned already.
     virtual void keepNewLockObject(KSLockObject* lock);
 
     virtual bool notifyRegEventFilter(QObject* obj, QEvent* event);
-    // False for a disabled widget.
+    // Returns false for a disabled widget.
     virtual bool isEnable(QObject* obj);
-    // Whether the object has a touch that was let through and has not ended.
+    // Returns whether the object has an accepted touch that has not ended.
     bool isTouched(QObject* obj) const;
 
-    // Breaks every lock, puts this one in their place, and cancels the touches that go on.
+    // Breaks every lock, activates this one instead, and cancels the current touches.
     void lock(KSLockObject* lockObject);
-    // Breaks every lock and cancels the touches that go on.
+    // Breaks every lock and cancels the current touches.
     void unlock();
-    // unlock(), and every lock object hears of it.
+    // Calls unlock() and notifies every lock object.
     void resetLock();
-    // Sends a key press to the soft keyboard while that is open. True when it was sent.
+    // Sends a key press to the soft keyboard if that is open. Returns whether it was sent.
     bool onKeyPress(QObject* obj, QEvent* event);
 
 Q_SIGNALS:
-    // A press or touch has begun somewhere in this process.
+    // Emitted when a press or touch begins anywhere in this process.
     void signalEventBegin();
 
 private:
@@ -111,7 +111,7 @@ private:
     void forgetTouch(QObject* obj);
     void touchedObjectDestroyed(QObject* obj);
     void breakLocks();
-    // All of them, or only those in a window.
+    // Cancels all touches, or only those in a window.
     void cancelTouches(const QWidget* window = nullptr);
     void cancelTouchWhenDisabled(QObject* obj);
     void cancelTouchWhenHidden(QObject* obj);
@@ -120,7 +120,8 @@ private:
     QMap<KSLockObject*, QList<QObject*>> m_active;
     QList<KSLockObject*> m_owned;
     QList<QObject*> m_eventFilters;
-    QList<QObject*> m_touched; // their touches were let through and go on; none of them is destroyed
-    QPointer<QObject> m_begun; // was let through last, and has not seen more of its touch
+    QList<QObject*> m_touched; // objects with an accepted touch that has not ended; none of them is destroyed
+    // the last object whose touch was accepted, until it receives another event of the touch
+    QPointer<QObject> m_begun;
     int m_begunId = -1;
 };

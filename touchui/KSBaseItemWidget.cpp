@@ -20,7 +20,7 @@ constexpr int HANDLE_SIZE = 22;
 constexpr int HANDLE_LEFT = 6;
 const QString HANDLE_PICTURE = QStringLiteral(":/MainButtons/Main_Move_Handle");
 
-// Where the press is, in global coordinates.
+// Returns the position of the press in global coordinates.
 QPoint pressPosition(const QEvent* event)
 {
     const auto& points = static_cast<const QPointerEvent*>(event)->points();
@@ -41,7 +41,7 @@ KSBaseItemWidget::KSBaseItemWidget(QWidget* parent)
     setGraphicsEffect(m_shadow);
 }
 
-// Most rows are never dragged.
+// Created when it is first needed, because most rows are never dragged.
 QLabel* KSBaseItemWidget::makeHandle()
 {
     auto* handle = new QLabel(this);
@@ -157,7 +157,7 @@ void KSBaseItemWidget::setPopup(bool popup)
 {
     m_shadow->setEnabled(popup);
     m_popup = popup;
-    // Its ground would show on the lifted look, which paints the handle itself.
+    // Hide the handle: its background would be visible on the lifted look, which paints the handle itself.
     if (m_handle)
         m_handle->setVisible(m_dragFlag && !popup);
     updateDragArea();
@@ -239,7 +239,7 @@ void KSBaseItemWidget::updateDragArea()
     }
 }
 
-// The application is only watched while there is a focus to lose.
+// The application's events are filtered only while the item has the focus and can lose it.
 void KSBaseItemWidget::setHasFocus(bool hasFocus)
 {
     if (m_hasFocus == hasFocus)
@@ -254,7 +254,7 @@ void KSBaseItemWidget::setHasFocus(bool hasFocus)
 bool KSBaseItemWidget::eventFilter(QObject* watched, QEvent* event)
 {
     const bool press = event->type() == QEvent::MouseButtonPress || event->type() == QEvent::TouchBegin;
-    // A press inside comes by again as it goes up through the parents, so its place tells, not its receiver.
+    // Check the position and not the receiver: a press inside the item is also delivered to its parents.
     if (press && m_hasFocus && !m_popup && watched->isWidgetType() &&
         !rect().contains(mapFromGlobal(pressPosition(event)))) {
         setHasFocus(false);
@@ -300,7 +300,7 @@ void KSBaseItemWidget::paintEvent(QPaintEvent*)
     if (m_popup) {
         paintDragBase(painter);
     } else {
-        // The rule of the style sheet alone: as a button it would get the style's bevel, too.
+        // Paint only the background of the style sheet; as a button, the item would also get a bevel.
         QStyleOption option;
         option.initFrom(this);
         style()->drawPrimitive(QStyle::PE_Widget, &option, &painter, this);

@@ -12,13 +12,13 @@ class QLabel;
 class QPainter;
 class QVBoxLayout;
 
-// On which side of an item its drag handle is.
+// The side of an item on which its drag handle is.
 enum DragFlagAlignment { DRAGFLAG_NONE = 0, DRAGFLAG_LEFT = 1, DRAGFLAG_RIGHT = 2 };
 
 enum ChildPosEnum { CHILD_LEFT = 0, CHILD_RIGHT = 1, CHILD_WHOLE = 2, CHILD_THIRD = 3 };
 
-// One row of a KSScrollViewerWidget: up to three child widgets, and a handle by which it can be dragged to
-// another place of the list. Mouse events pass through it to the list. GUI thread only.
+// One row of a KSScrollViewerWidget: up to three child widgets, and a handle for dragging it to another
+// position in the list. Mouse events are left to the list. GUI thread only.
 class KSBaseItemWidget : public KSPushbutton
 {
     Q_OBJECT
@@ -26,35 +26,36 @@ public:
     explicit KSBaseItemWidget(QWidget* parent = nullptr);
     ~KSBaseItemWidget() override;
 
-    // Takes the child over and deletes the one that it replaces; null empties the place. The whole place
-    // takes the room of all three. The item's parent object becomes an event filter of the child.
+    // Takes ownership of the child and deletes the one that it replaces; null leaves the position empty.
+    // CHILD_WHOLE replaces all three. The item's parent object becomes an event filter of the child.
     virtual void setChild(QWidget* child, ChildPosEnum position);
-    // Lays the children out, left and right side by side and the third below. For items that do not place
+    // Creates a layout: left and right child side by side, the third below. For items that do not position
     // their children themselves.
     virtual void createWidget();
     virtual QWidget* getChild(ChildPosEnum position) const;
     virtual QWidget* getLeftChild() const;
-    // The left child when that fills the whole item.
+    // Returns the left child if that fills the whole item.
     virtual QWidget* getRightChild() const;
     virtual QWidget* getThirdChild() const;
-    // A copy that floats under the finger during a drag; the caller owns it. Null: the item itself floats.
+    // Returns a copy that floats under the finger during a drag and is owned by the caller, or null if the
+    // item itself shall float.
     virtual KSBaseItemWidget* clone();
     virtual void setSelectedStyle();
     virtual void setNormalStyle();
-    // A lifted item has a shadow and a base of its own.
+    // A lifted item has a shadow and its own background pictures.
     virtual void setPopup(bool popup);
-    // Pixels between the children and around them, for createWidget().
+    // Sets the space between the children and around them in pixels, for createWidget().
     virtual void setSpace(int between, int around);
-    // Shows or hides the handle.
+    // Shows or hides the drag handle.
     virtual void setDragFlag(bool dragFlag);
     virtual void setDragFlagAlignment(DragFlagAlignment alignment);
     virtual DragFlagAlignment getDragFlagAlignment() const;
-    // Where a finger takes the handle, in item coordinates; null without an alignment.
+    // Returns the touch area of the drag handle in item coordinates; null without an alignment.
     virtual QRect getDragArea() const;
 
     bool isPopup() const { return m_popup; }
     bool hasDragFlag() const { return m_dragFlag; }
-    // A press elsewhere ends it with signalLostFocus().
+    // The focus is lost, with signalLostFocus(), by a press outside the item.
     void setHasFocus(bool hasFocus);
     bool hasFocusFlag() const { return m_hasFocus; }
 
@@ -63,7 +64,7 @@ public:
 Q_SIGNALS:
     void signalResize();
     void signalLostFocus();
-    // Asks the list to lift this item.
+    // Requests that the list lifts this item.
     void signalStartMove(KSBaseItemWidget* item);
 
 protected:
@@ -95,5 +96,5 @@ private:
     QRect m_dragArea;
     bool m_hasFocus = false;
     QLabel* m_handle = nullptr;
-    QGraphicsDropShadowEffect* m_shadow = nullptr; // the widget owns it
+    QGraphicsDropShadowEffect* m_shadow = nullptr; // owned by the widget
 };

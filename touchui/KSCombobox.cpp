@@ -27,13 +27,13 @@ namespace
 
 constexpr int FRAME = 8;        // of the list's window
 constexpr int TEXT_MARGIN = 10; // of the closed box
-constexpr int WITHOUT_BAR = 44; // what a list is wider than its longest text
-constexpr int WITH_BAR = 76;    // the same beside a scroll bar
+constexpr int WITHOUT_BAR = 44; // width of a list in addition to its longest text
+constexpr int WITH_BAR = 76;    // the same for a list with a scroll bar
 constexpr int TEXT_PIXELS = 24;
 const QColor TEXT_COLOR(220, 220, 220);
 const QColor DISABLED_COLOR(102, 102, 102);
 
-// The list is one that scrolls, not a menu over the box with arrows at its ends.
+// Requests a scrolling list instead of a menu that covers the box.
 class ComboStyle : public QProxyStyle
 {
 public:
@@ -47,7 +47,7 @@ public:
         case SH_Menu_FlashTriggeredItem:
         case SH_Menu_FadeOutOnHide:
             return 0;
-        case SH_ComboBox_PopupFrameStyle: // the list paints its own
+        case SH_ComboBox_PopupFrameStyle: // the list paints its own frame
             return QFrame::NoFrame;
         default:
             return QProxyStyle::styleHint(hint, option, widget, returnData);
@@ -74,7 +74,7 @@ KSCombobox::KSCombobox(QWidget* parent)
     QFont textFont = font();
     textFont.setPixelSize(TEXT_PIXELS);
     setFont(textFont);
-    // An editable box's field shows the pictures behind it.
+    // Make the field of an editable box transparent, so that the pictures behind it are visible.
     QPalette colors = palette();
     colors.setColor(QPalette::Base, Qt::transparent);
     for (const QPalette::ColorGroup group : {QPalette::Active, QPalette::Inactive}) {
@@ -99,7 +99,7 @@ KSCombobox::~KSCombobox()
     }
 }
 
-// Takes over the window that the base keeps the list in.
+// Configures the window in which the base class shows the list.
 void KSCombobox::initPopup()
 {
     m_popup = m_view->parentWidget();
@@ -175,7 +175,7 @@ void KSCombobox::showPopup()
         return;
     }
     m_shown = true;
-    // So that the list closes when another process needs the touch.
+    // Announce the open list, so that it is closed when another process needs the touch.
     if (KSEventProcessLockObject::s_instance != nullptr) {
         KSEventProcessLockObject::s_instance->tryLock(this, LOCKMETHOD_OTHER, nullptr);
     }
@@ -312,13 +312,13 @@ bool KSCombobox::handlePopupWidgetEvent(QObject*, QEvent* event)
     case QEvent::Paint:
         drawPopListTranslucent(m_popup);
         return true;
-    case QEvent::Show: // the base takes it away with every change of size
+    case QEvent::Show: // the base class removes the mask when the size changes
         m_popup->setMask(listFrame().mask(m_popup->size()));
         return false;
     case QEvent::Hide:
         popupHidden();
         return false;
-    // On the frame, beside the rows.
+    // Presses on the frame beside the rows are ignored.
     case QEvent::MouseButtonPress:
     case QEvent::MouseButtonRelease:
     case QEvent::MouseMove:
@@ -346,7 +346,7 @@ bool KSCombobox::event(QEvent* event)
     return m_finger.takes(event) || QComboBox::event(event);
 }
 
-// The box comes up; a field that was pressed lets go without being clicked.
+// Releases the box and, if its line edit is pressed, releases that without a click.
 void KSCombobox::comeUp()
 {
     setPressed(false);

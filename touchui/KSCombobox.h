@@ -13,14 +13,14 @@ class CustomComboBoxDelegate;
 class CustomComboBoxView;
 class OutsidePressFilter;
 
-// A combo box for one finger, painted from pictures. Its list is a window of its own that closes by a choice,
-// by a press outside and when another process takes the touch; it is no popup of Qt's, so touches go on
-// reaching everything else.
+// A combo box that is operated with one finger and painted from pictures. Its list is a separate window that
+// closes when a row is chosen, on a press outside, and when another process takes the touch. It is not a Qt
+// popup, so other widgets still receive touches.
 class KSCombobox : public QComboBox
 {
     Q_OBJECT
 public:
-    // A row with this role set to true is one that setUSBEnabled switches.
+    // Set to true for rows that setUSBEnabled enables and disables.
     static constexpr int USBRole = Qt::UserRole + 100;
 
     explicit KSCombobox(QWidget* parent = nullptr);
@@ -31,30 +31,30 @@ public:
     bool isPopupVisible() const;
     CustomComboBoxView* listView() const { return m_view; }
 
-    // While off, the list does not open.
+    // If false, the list does not open.
     void setPopupEnable(bool enable) { m_popupEnable = enable; }
-    // The list is wide enough for the longest text instead of as wide as the box.
+    // Makes the list wide enough for the longest text instead of as wide as the box.
     void setListWidthByText(bool byText) { m_listWidthByText = byText; }
-    // The list opens above the box. Without room it opens on the other side.
+    // Opens the list above the box if there is room, else below.
     void setPopupUpper(bool upper) { m_popupUpper = upper; }
-    // Rows and box show colours, see CustomComboBoxDelegate.
+    // Shows colours in the rows and in the box, see CustomComboBoxDelegate.
     void setColorPallete(bool on);
-    // Enables or disables the rows of USBRole.
+    // Enables or disables the rows with USBRole.
     void setUSBEnabled(bool enabled);
-    // The pictures of the closed box: path + "_Left", "_Center", "_Pulldown", and the same after "_Pressed"
-    // and "_Disable".
+    // Sets the pictures of the closed box: path + "_Left", "_Center", "_Pulldown", and the same with
+    // "_Pressed" and "_Disable".
     void setBackgroundImagesPath(const QString& path);
-    // These hide an open list, too.
+    // These also hide an open list.
     void setEnabled(bool enabled);
     void setDisabled(bool disabled);
 
-    // The width of the list for a box and a longest text of these widths, in pixels.
+    // Returns the width of the list for a box and a longest text of these widths, in pixels.
     static int listWidth(int width, int textWidth, bool byText, bool withScrollBar);
 
 Q_SIGNALS:
-    // The list is about to open, if it can.
+    // Emitted before the list opens, even if it then cannot.
     void signalPopupShow();
-    // The list has been opened or closed.
+    // Emitted when the list was opened or closed.
     void signalShowComboxList(bool shown);
 
 protected:
@@ -70,9 +70,9 @@ protected:
     virtual void adjustPopupListSize();
     virtual void adjustPopupListPostion();
     virtual void drawPopListTranslucent(QWidget* popup);
-    // The text of the closed box that cannot be typed in; painter has font and pen.
+    // Draws the text of a box that is not editable; font and pen of painter are set.
     virtual void drawText(QPainter& painter, const QRect& area);
-    // Keys for the list: Escape closes, Return chooses, Up and Down move the cursor.
+    // Handles the keys of the list: Escape closes, Return chooses, Up and Down move the cursor.
     virtual bool KeyEventFilter(QObject* obj, QEvent* event);
     virtual bool handlePopupWidgetEvent(QObject* obj, QEvent* event);
 
@@ -87,7 +87,7 @@ private:
     void comeUp();
     int longestTextWidth() const;
 
-    QWidget* m_popup = nullptr; // the list's window, owned by the base
+    QWidget* m_popup = nullptr; // the list's window, owned by the base class
     CustomComboBoxView* m_view;
     CustomComboBoxDelegate* m_delegate;
     OutsidePressFilter* m_outsidePress = nullptr;
@@ -98,6 +98,6 @@ private:
     bool m_listWidthByText = false;
     bool m_popupUpper = false;
     bool m_pressed = false;
-    bool m_shown = false; // signalShowComboxList(true) was sent last
+    bool m_shown = false; // the last signalShowComboxList() was sent with true
     OneFinger m_finger{this};
 };

@@ -6,7 +6,7 @@ int KSCommonStyle::styleHint(StyleHint hint, const QStyleOption* option, const Q
                              QStyleHintReturn* returnData) const
 {
     switch (hint) {
-    // A finger needs no hover, no mnemonics, no blinking and no context menus.
+    // Turn off hover, mnemonics, blinking and context menus, which are of no use with a finger.
     case SH_UnderlineShortcut:
     case SH_BlinkCursorWhenTextSelected:
     case SH_Menu_FlashTriggeredItem:

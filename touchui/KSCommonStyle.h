@@ -2,7 +2,8 @@
 
 #include <QCommonStyle>
 
-// The base of the styles that paint from pictures: a plain style with the behaviour that suits a finger.
+// Base class of the styles that paint from pictures: a plain style with the behaviour for operation with a
+// finger.
 class KSCommonStyle : public QCommonStyle
 {
     Q_OBJECT

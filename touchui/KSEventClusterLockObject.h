@@ -2,13 +2,13 @@
 
 #include "touchui/KSLockObject.h"
 
-// Up to MAX_HOLDERS of the registered objects together.
+// A lock that up to MAX_HOLDERS of the registered objects hold at the same time.
 class KSEventClusterLockObject : public KSLockObject
 {
 public:
     static constexpr int MAX_HOLDERS = 5;
 
-    // The caller owns the result, unless the parent does.
+    // The parent owns the result; without a parent the caller does.
     static KSEventClusterLockObject* createFactory(QObject* parent);
 
     int tryLock(QObject* obj, LOCKMETHOD_TYPE method, void* param) override;

@@ -5,23 +5,23 @@
 
 class KSAppEventFilter;
 
-// The lock of last resort, which any object may take: one at a time. A watchdog breaks every lock of the
-// filter when its holder shows no sign of life for WATCHDOG_MSEC on the clock of the touch widgets.
+// The default lock, which any object may hold, one at a time. A watchdog breaks every lock of the filter if
+// the holder receives no touch event for WATCHDOG_MSEC, measured with TouchTimer.
 class KSEventDefaultMutexLockObject : public KSLockObject
 {
     Q_OBJECT
 public:
     static constexpr int WATCHDOG_MSEC = 10000;
 
-    // The one instance, made at the first call. Whoever asked first owns it; deleting it lets the next call
-    // make another.
+    // Returns the only instance, which the first call creates with the given parent. After it was deleted,
+    // the next call creates another one.
     static KSEventDefaultMutexLockObject* createFactory(KSAppEventFilter* filter, QObject* parent);
     ~KSEventDefaultMutexLockObject() override;
 
     int tryLock(QObject* obj, LOCKMETHOD_TYPE method, void* param) override;
     int tryUnlock(QObject* obj, LOCKMETHOD_TYPE method) override;
     bool isLocked() override { return m_locked; }
-    // A yes is a sign of life of the holder.
+    // Restarts the watchdog if obj is the holder.
     bool isLockedObj(QObject* obj, LOCKMETHOD_TYPE method) override;
     int registerObj(QObject* obj) override;
     int unregisterObj(QObject* obj) override;

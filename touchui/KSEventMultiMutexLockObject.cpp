@@ -48,7 +48,7 @@ bool KSEventMultiMutexLockObject::isLockedObj(QObject* obj, LOCKMETHOD_TYPE meth
 int KSEventMultiMutexLockObject::registerObj(QObject* obj)
 {
     KSLockObject* part = partOf(obj);
-    // A group inside itself would ask itself for ever.
+    // A group that contained itself would recurse without end.
     if (part == nullptr || part == this) {
         return -1;
     }

@@ -2,20 +2,21 @@
 
 #include "touchui/KSLockObject.h"
 
-// A group of locks that works as one: each request goes to the first of them that knows the object.
+// A group of locks that works as one: each request is passed to the first lock for which the object is
+// registered.
 class KSEventMultiMutexLockObject : public KSLockObject
 {
 public:
-    // The caller owns the result, unless the parent does.
+    // The parent owns the result; without a parent the caller does.
     static KSEventMultiMutexLockObject* createFactory(QObject* parent);
 
     int tryLock(QObject* obj, LOCKMETHOD_TYPE method, void* param) override;
     int tryUnlock(QObject* obj, LOCKMETHOD_TYPE method) override;
-    // Only when every part is; an empty group counts as locked.
+    // Returns whether every lock of the group is locked; true for an empty group.
     bool isLocked() override;
     bool isLockedObj(QObject* obj, LOCKMETHOD_TYPE method) override;
-    // Take the parts of the group, which stay the caller's: lock objects without a meta-object of their own.
-    // Anything else gives -1 and changes nothing.
+    // Add and remove locks of the group, which the caller keeps owning. obj must be a lock object without a
+    // meta-object of its own; for anything else they return -1 and change nothing.
     int registerObj(QObject* obj) override;
     int unregisterObj(QObject* obj) override;
     bool isRegisterObj(QObject* obj) override;

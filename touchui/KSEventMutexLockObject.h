@@ -2,11 +2,11 @@
 
 #include "touchui/KSLockObject.h"
 
-// One of the registered objects at a time.
+// A lock that one of the registered objects holds at a time.
 class KSEventMutexLockObject : public KSLockObject
 {
 public:
-    // The caller owns the result, unless the parent does.
+    // The parent owns the result; without a parent the caller does.
     static KSEventMutexLockObject* createFactory(QObject* parent);
 
     int tryLock(QObject* obj, LOCKMETHOD_TYPE method, void* param) override;

@@ -57,7 +57,7 @@ int KSEventProcessLockObject::unregisterObj(QObject* obj)
     return 0;
 }
 
-// Always false: no touch can acquire this lock, and so nobody passes it once it is active.
+// Always false: no touch can acquire this lock, so it blocks every touch while it is active.
 bool KSEventProcessLockObject::isRegisterObj(QObject*)
 {
     return false;

@@ -7,20 +7,20 @@
 
 class KSAppEventFilter;
 
-// The touch lock between the processes of the appliance. It announces every lock and unlock of this process,
-// and while another process has announced one it stands in the filter as a lock that no object can pass. It
-// accepts no object itself.
+// The touch lock between the processes of the appliance. It announces every lock and unlock of this process.
+// While another process has announced a lock, it is active in the filter as a lock that no object can
+// acquire.
 class KSEventProcessLockObject : public KSLockObject
 {
     Q_OBJECT
 public:
-    // Made by the application's filter, which fills s_instance.
+    // Created by the application's filter, which sets s_instance.
     explicit KSEventProcessLockObject(KSAppEventFilter* filter, QObject* parent = nullptr);
     ~KSEventProcessLockObject() override;
 
-    // Remembers the object and announces that a touch is going on in it; always -1.
+    // Remembers the object and announces that it is in use; always returns -1.
     int tryLock(QObject* obj, LOCKMETHOD_TYPE method, void* param) override;
-    // Forgets the object and announces the end; always -1.
+    // Forgets the object and announces that its use has ended; always returns -1.
     int tryUnlock(QObject* obj, LOCKMETHOD_TYPE method) override;
     bool isLocked() override { return false; }
     bool isLockedObj(QObject* obj, LOCKMETHOD_TYPE method) override;
@@ -31,19 +31,22 @@ public:
     void reset() override {}
     QList<QObject*> registeredObj() override { return {}; }
 
-    // Whether an object of this process holds a touch that was announced.
+    // Returns whether an object of this process holds a touch that was announced.
     bool isLocallyLocked() const { return m_locallyLocked; }
 
-    // What a remembered object is sent when another process asks this one to give way.
+    // Type of the event that is sent to the remembered object when another process asks this one to close its
+    // transient controls.
     static constexpr int RestoreOriginalType = 1001;
     static KSEventProcessLockObject* s_instance;
 
 public Q_SLOTS:
-    // Another process has locked or unlocked. Runs in the emitter's thread, which must be the GUI thread.
+    // Called when another process has locked or unlocked. Runs in the thread of the emitter, which must be
+    // the GUI thread.
     void slotGetAppEvent(APPEventDefine::_tagAPPEvent event);
-    // A touch has begun here: asks the other process to give way if it only holds a transient control open.
+    // Called when a touch begins in this process. If the other process only has a transient control open,
+    // asks it to close that.
     void slotRestoreOriginal();
-    // Another process asks this one to give way.
+    // Called when another process asks this one to close its transient controls.
     void slotRestoreAll();
 
 private:

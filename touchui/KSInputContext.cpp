@@ -37,7 +37,7 @@ QString applicationName()
     return application == nullptr ? QString() : application->objectName();
 }
 
-// In this application the keyboard service alone says whether its window is up.
+// Returns whether the keyboard service alone decides if its window counts as open. True for this application.
 bool serviceOwnsState()
 {
     return applicationName() == QLatin1String("Titler");
@@ -61,7 +61,7 @@ KSInputContext::KSInputContext(std::unique_ptr<QPlatformInputContext> inner)
     if (s_instance == nullptr) {
         s_instance = this;
     }
-    // The X11 platform looks for the method that composes by its name, to hand it the keyboard's context.
+    // The X11 platform finds the composing input method by this name and passes it the keyboard's context.
     setObjectName(m_inner->objectName());
     INIT_LOGGING(L"KS2Titler");
 }
@@ -93,7 +93,7 @@ void KSInputContext::setClosed(bool closed)
     }
 }
 
-// The keys and the requests of fields.
+// --- Keys and requests of fields ----------------------------------------------------------------------
 
 bool KSInputContext::filterEvent(const QEvent* event)
 {
@@ -120,7 +120,7 @@ bool KSInputContext::forwardKeyPress(const QEvent* event)
         return false;
     }
     if (!m_controller->isReachable()) {
-        setClosed(true); // nobody would send the key back: the field takes it as it is
+        setClosed(true); // the service would not send the key back, so the field handles it
         return false;
     }
     m_controller->sendKey(*key);
@@ -138,7 +138,7 @@ bool KSInputContext::filterRequestSoftwareInputPanel()
         KSInputFocusManager::giveFocus(m_windowId);
         return false;
     }
-    commit(); // keys go to the service from now on; what was being composed must not be lost
+    commit(); // keys go to the service from now on, so composed text would be lost
     return showForFocusWidget(getSendData());
 }
 
@@ -166,7 +166,7 @@ bool KSInputContext::filterCloseSoftwareInputPanel()
     return true;
 }
 
-// The focus.
+// --- Focus --------------------------------------------------------------------------------------------
 
 void KSInputContext::setFocusWidget(QWidget* widget)
 {
@@ -217,7 +217,7 @@ tagSoftKeyBoardInitData KSInputContext::sendDataOf(const InputField* field)
     return data;
 }
 
-// The keyboard window.
+// --- Keyboard window ----------------------------------------------------------------------------------
 
 void KSInputContext::showSoftKeyBoardWindow(tagSoftKeyBoardInitData data)
 {
@@ -302,7 +302,7 @@ void KSInputContext::setWindowID(unsigned long id)
     LOG_DEBUG_OPERATE(L"KSInputContext", 200, text.toStdWString());
 }
 
-// What the service sends.
+// --- Calls of the service -----------------------------------------------------------------------------
 
 void KSInputContext::handleInputString(const std::wstring& text, bool onEnter)
 {
@@ -352,7 +352,7 @@ void KSInputContext::sendKey(tagSoftKeyBoardKeyData data)
         m_controller->close();
         setClosed(true);
     }
-    const auto field = InputField::of(widget); // what has closed may have taken it along
+    const auto field = InputField::of(widget); // closing may have destroyed the field
     QObject* target = field == nullptr ? widget.data() : field->keyReceiver();
     if (target == nullptr) {
         return;
@@ -395,7 +395,7 @@ void KSInputContext::sendEvent(const QInputMethodEvent& event)
     }
 }
 
-// What Qt calls.
+// --- Calls of Qt --------------------------------------------------------------------------------------
 
 void KSInputContext::setXkbContext(struct xkb_context* context)
 {
@@ -403,8 +403,8 @@ void KSInputContext::setXkbContext(struct xkb_context* context)
                               Q_ARG(struct xkb_context*, context));
 }
 
-// Qt asks after each click, and also after each key release, in a field. Keys must not bring back a keyboard
-// that the operator has put away, and need not show one that is up.
+// Qt calls this after each click in a field and also after each key release. A key must not reopen a keyboard
+// that the operator has closed.
 void KSInputContext::showInputPanel()
 {
     if (m_sendingKeyEvent || m_keyReleases.isReleasing()) {
@@ -414,9 +414,9 @@ void KSInputContext::showInputPanel()
     filterEvent(&request);
 }
 
-// Qt asks when a field loses the focus, and also when Enter is pressed in it, which is decided where the key
-// is delivered. A window of another process that takes the focus, such as the keyboard itself, does not end
-// the field.
+// Qt calls this when a field loses the focus, and also when Enter is pressed in it, which is handled where
+// the key is delivered. The field is not ended if a window of another process, such as the keyboard, takes
+// the focus.
 void KSInputContext::hideInputPanel()
 {
     const bool stillInField = m_pFocusWidget != nullptr && m_pFocusWidget->hasFocus();

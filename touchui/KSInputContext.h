@@ -1,5 +1,3 @@
-// The input context of the application: the fields of this program are filled by a soft keyboard that lives
-// in another process of the appliance.
 #pragma once
 
 #include "messaging/services/ISoftKeyBoardController.h"
@@ -22,87 +20,88 @@ class QInputMethodEvent;
 class QLineEdit;
 struct xkb_context;
 
-// Describes the focused field to the soft keyboard service, and applies the strings, keys and cursor
-// positions that the service sends back. The field is a QLineEdit, an editable QComboBox or a text item of a
-// QGraphicsView.
+// The input context of the application: connects the fields of this program to the soft keyboard, which runs
+// in another process. Describes the focused field to the soft keyboard service, and applies the strings, keys
+// and cursor positions that the service sends. The field is a QLineEdit, an editable QComboBox or a text item
+// of a QGraphicsView. It is described by its object name, see FieldName.
 //
-// Qt makes and owns the one instance: install() before QApplication, instance() after it; never delete it.
-// GUI thread only. Without a controller every operation that would talk to the service does nothing and the
-// physical keyboard works as usual, through the input method that the environment asks for.
-//
-// A field describes itself by its object name, see FieldName.
+// Qt creates and owns the only instance: call install() before QApplication is constructed and instance()
+// afterwards; never delete it. GUI thread only. Without a controller, nothing is sent to the service, and the
+// physical keyboard works as usual through the input method that the environment selects.
 class KSInputContext : public QPlatformInputContext, public ISoftKeyBoardControllerCallBack
 {
     Q_OBJECT
 public:
-    // Chooses this class as the input context of the QApplication that is made next.
+    // Selects this class as the input context of the next QApplication.
     static void install();
-    // Null before QApplication, and when install() was not called.
+    // Returns null before QApplication is constructed, and if install() was not called.
     static KSInputContext* instance() { return s_instance; }
 
-    // Made by the plug-in. inner is the input method that serves the physical keyboard; may be null.
+    // Called by the plug-in. inner is the input method for the physical keyboard; may be null.
     explicit KSInputContext(std::unique_ptr<QPlatformInputContext> inner = nullptr);
     ~KSInputContext() override;
 
     QString identifierName() const { return QStringLiteral("KSInputContext"); }
     QString language() const { return QString(); }
 
-    // The service; not owned, null takes it away and leaves the keyboard closed.
+    // Sets the service, which is not owned. Null disconnects from the service and marks the keyboard as
+    // closed.
     void setKeyBoardController(ISoftKeyBoardController* controller);
     ISoftKeyBoardController* getKeyBoardController() const { return m_controller; }
 
-    // True while a key of the service is being delivered, so that it is not sent back.
+    // Returns true while a key of the service is being delivered, so that it is not sent back.
     bool isSendingKeyEvent() const { return m_sendingKeyEvent; }
     static bool isSoftKeyboardClosed() { return m_bClosed; }
 
-    // Sends a key press to the service; false without a controller.
+    // Sends a key press to the service. Returns false without a controller.
     bool forwardKeyPress(const QEvent* event);
-    // Events of type 199 open the keyboard for the focus widget and those of type 200 close it; key presses
-    // go to the service while the keyboard is open. True when the event was used up.
+    // Opens the keyboard for the focus widget on events of type 199 and closes it on those of type 200; sends
+    // key presses to the service while the keyboard is open. Returns whether the event was handled.
     bool filterEvent(const QEvent* event) override;
-    // True for keys that the open keyboard keeps to itself: Tab, Space, Home, End, page keys and F1 to F12.
+    // Returns true for keys that the open keyboard handles itself: Tab, Space, Home, End, page keys and F1 to
+    // F12.
     bool filterSpecialKeyEvent(const QEvent* event) const;
 
     void setFocusWidget(QWidget* widget);
     QWidget* focusWidget() const { return m_baseFocusWidget; }
-    // Lets the next request look at the widget that has the focus now, instead of the one the keyboard was
-    // opened for.
+    // Makes the next request use the widget that has the focus then, instead of the one for which the
+    // keyboard was opened.
     static void resetFocusWidget() { m_pFocusWidget.clear(); }
-    // The widget that the keyboard works for: it outlives a change of focus while the keyboard is open.
+    // Returns the widget for which the keyboard is open, even if the focus has changed since.
     QWidget* getFocusWidget();
-    // The text item of the view that is being edited, null when there is none.
+    // Returns the text item of the view that is being edited, or null.
     static QGraphicsTextItem* getFocusTextItem(QGraphicsView* view);
 
     SubCommonDefine::tagSoftKeyBoardInitData getSendData();
     SubCommonDefine::tagSoftKeyBoardInitData getSendData(QLineEdit* edit);
 
-    // Opens the keyboard with a record of the caller's.
+    // Opens the keyboard with a record that the caller provides.
     void showSoftKeyBoardWindow(SubCommonDefine::tagSoftKeyBoardInitData data);
-    // Ends a field: the state changes at once only in applications other than "Titler"; here the service
-    // reports it.
+    // Closes the keyboard at the service. The state is updated at once only in applications other than
+    // "Titler"; there the service reports it.
     void closeSoftKeyBoardWindow();
-    // Put the keyboard away without its closing ceremony; closed at once.
+    // Close the keyboard without the usual steps; the state is updated at once.
     void dummyCloseSoftKeyBoardWindow();
     void simpleCloseSoftKeyBoardWindow();
-    // These four act only while the keyboard is open.
+    // These four have an effect only while the keyboard is open.
     void showLimitInfo(SubCommonDefine::taLimitInfo info);
     void cancelLimitInfo();
     void showMaskOnSoftKeyboard();
     void hideMaskOnSoftKeyboard();
 
-    // The native window that takes the X11 input focus when no field has it.
+    // Sets the native window that gets the X11 input focus when no field has it.
     void setWindowID(unsigned long id);
 
-    // Commits what an input method is composing, then passes the event to the focus widget.
+    // Commits text that an input method is composing, then passes the event to the focus widget.
     void sendEvent(const QInputMethodEvent& event);
 
-    // What the service sends.
+    // Calls of the service.
     void sendInputString(std::wstring text) override { handleInputString(text, false); }
     void sendInputStringOnEnterPressing(std::wstring text) override { handleInputString(text, true); }
     void sendInputStringOnTextChanged(std::wstring text) override;
     void sendKey(SubCommonDefine::tagSoftKeyBoardKeyData data) override;
     void sendInputStringSelectionPos(SubCommonDefine::tagSoftKeyBoardKeyTextSelectionPos pos) override;
-    // True tells that the keyboard is up.
+    // shown is true if the keyboard is open.
     void sendSoftKeyboardState(bool shown) override { setClosed(!shown); }
 
     // The part of an input context that Qt calls.
@@ -119,7 +118,7 @@ public:
     void hideInputPanel() override;
     bool isInputPanelVisible() const override { return !m_bClosed; }
     void setFocusObject(QObject* object) override;
-    // Called by name while the X11 platform starts, for an inner method that composes.
+    // Called by name when the X11 platform starts, for an inner method that composes.
     Q_INVOKABLE void setXkbContext(struct xkb_context* context);
     bool event(QEvent* event) override;
 
@@ -127,7 +126,7 @@ public:
     static QPointer<QWidget> m_pFocusWidget;
     static QString m_strLimitCondition; // pattern of the field's validator
     static constexpr int SoftKeyBoardCloseType = 1100;
-    static QEvent m_eKeyBoardClosed; // what a field gets when the keyboard was closed under it
+    static QEvent m_eKeyBoardClosed; // sent to a field when the keyboard was closed
 
 private:
     bool filterKeyPressEvent(const QEvent* event) { return !m_bClosed && forwardKeyPress(event); }
@@ -145,7 +144,7 @@ private:
     void setClosed(bool closed);
 
     static KSInputContext* s_instance;
-    std::unique_ptr<QPlatformInputContext> m_inner; // without an input method one that does nothing
+    std::unique_ptr<QPlatformInputContext> m_inner; // never null; a dummy without an input method
     ISoftKeyBoardController* m_controller = nullptr;
     bool m_sendingKeyEvent = false;
     unsigned long m_windowId = 0;

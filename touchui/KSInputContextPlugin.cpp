@@ -28,7 +28,7 @@ QPlatformInputContext* KSInputContextPlugin::create(const QString& key, const QS
     if (key.compare(QLatin1String(KEY), Qt::CaseInsensitive) != 0) {
         return nullptr;
     }
-    // X11 needs an input method even without a daemon: dead keys and the compose key come from it.
+    // On X11 an input method is needed even without a daemon: it handles dead keys and the compose key.
     QString inner = innerMethod();
     if (inner.isEmpty() && QGuiApplication::platformName() == QLatin1String("xcb")) {
         inner = QStringLiteral("compose");
@@ -40,5 +40,5 @@ QPlatformInputContext* KSInputContextPlugin::create(const QString& key, const QS
     return new KSInputContext(std::move(context));
 }
 
-// The plug-in's description is compiled here, where it is known that the plug-in is a part of the program.
+// Included here, so that the plug-in is compiled as a static part of the program.
 #include "moc_KSInputContextPlugin.cpp"

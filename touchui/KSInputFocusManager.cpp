@@ -13,7 +13,8 @@ int ignoreError(Display*, XErrorEvent*)
     return 0;
 }
 
-// A display connection on which an error, such as a window that was just closed, does not end the process.
+// Opens a display connection. While it is open, X11 errors, for example for a window that was just closed, do
+// not end the process.
 class DisplayConnection
 {
 public:
@@ -26,7 +27,7 @@ public:
     ~DisplayConnection()
     {
         if (m_display != nullptr) {
-            XCloseDisplay(m_display); // waits for the answers, so the handler must still stand
+            XCloseDisplay(m_display); // waits for all replies, so the error handler must still be installed
             XSetErrorHandler(m_previousHandler);
         }
     }
@@ -75,8 +76,8 @@ void KSInputFocusManager::giveFocus(unsigned long window)
     }
 }
 
-// A window may hear that it was activated when a dialog has opened before it already. It leaves the keyboard
-// to the dialog: each would take it from the other without end.
+// Does nothing while a modal dialog is open: a window may be activated after a dialog has opened before it,
+// and both would take the focus from each other without end.
 void KSInputFocusManager::giveFocus(const QWidget* widget)
 {
     if (widget == nullptr || !widget->window()->isVisible() || widget->window()->internalWinId() == 0) {

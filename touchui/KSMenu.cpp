@@ -260,7 +260,7 @@ bool KSMenu::onMouseEvent(QEvent* event)
     const auto* mouse = static_cast<QMouseEvent*>(event);
     const QPoint position = mouse->position().toPoint();
     if (m_finger.isDown()) {
-        return true; // a finger has the menu
+        return true; // a finger is using the menu
     }
     if (event->type() == QEvent::MouseMove) {
         onMouseMove(position);
@@ -336,7 +336,7 @@ void KSMenu::onMouseButtonRelease(const QPoint& position, Qt::MouseButton button
     }
     close();
     if (action != nullptr) {
-        action->trigger(); // and with it triggered(QAction*)
+        action->trigger(); // also emits triggered(QAction*)
     }
 }
 
@@ -348,7 +348,7 @@ void KSMenu::setCurrent(int row)
     }
 }
 
-// Without a compositor what is transparent would be black.
+// Without a compositor, transparent pixels would be black.
 void KSMenu::adjustMask()
 {
     QPixmap shape(size());
@@ -370,7 +370,7 @@ void KSMenu::drawBalloon(QPainter& painter) const
     if (m_arrow.isNull()) {
         return;
     }
-    // The picture points up, and has a piece of the frame below its tip.
+    // The arrow's picture points up. Its lower part overlaps the frame.
     painter.save();
     switch (place.side) {
     case ArrowSide::Top:

@@ -11,9 +11,9 @@ class OutsidePressFilter;
 class QTimer;
 class QTouchEvent;
 
-// A menu for one finger: a balloon with an arrow to its anchor, one row for each visible action. It closes by
-// a choice, by a press outside (which presses nothing else), by its timer or by close(). It is no popup of
-// Qt's, so that the finger that opened it is still lifted where it came down.
+// A menu that is operated with one finger: a balloon with an arrow to its anchor and one row for each visible
+// action. It closes when a row is chosen, on a press outside (which has no other effect), by its timer or by
+// close(). It is not a Qt popup, so that the widget under the finger that opened it still receives the lift.
 class KSMenu : public QMenu
 {
     Q_OBJECT
@@ -21,38 +21,38 @@ public:
     explicit KSMenu(QWidget* parent = nullptr, const QFont& font = QFont());
     ~KSMenu() override;
 
-    // Bounds the placement of all menus; not owned. Null: the screen does.
+    // Sets the window that limits the placement of all menus; not owned. If null, the screen is the limit.
     static void setMainWindow(QWidget* window) { s_parent = window; }
     static QWidget* s_parent;
 
-    // A combination of MenuPlacement::Flag.
+    // flags is a combination of MenuPlacement::Flag.
     virtual void setBalloonAlignment(int flags);
     virtual bool testBalloonAlignment(int flag) const;
 
-    // Opens at the anchor, in global coordinates.
+    // Opens the menu at the anchor, in global coordinates.
     void popup(const QPoint& anchor, QAction* atAction = nullptr);
 
-    // Milliseconds after which the menu closes by itself; 0 is never.
+    // Sets the time in milliseconds after which the menu closes; 0 for never.
     void setAutoCloseTime(int milliseconds);
     int autoCloseTime() const { return m_autoCloseTime; }
-    // These act only when a time is set.
+    // These have an effect only if a time is set.
     void startAutoCloseTimer();
     void restartAutoCloseTimer();
 
-    // In menu coordinates.
+    // These return menu coordinates.
     virtual QPolygon getMenuPointPoints() const;
     virtual QRect getMenuBackgroundRect() const;
     virtual int getMenuItemHeight() const;
     QRect getMenuItemRect(int row) const;
-    // The row under the point; -1 outside all.
+    // Returns the row at the point, or -1.
     int cursorItem(const QPoint& point) const;
-    // The row that is marked; -1 for none.
+    // Returns the highlighted row, or -1.
     int currentItem() const { return m_current; }
 
     QSize sizeHint() const override;
 
 Q_SIGNALS:
-    // The visible menu is being closed.
+    // Emitted when the visible menu is about to close.
     void signalMenuAboutToClose();
 
 protected:

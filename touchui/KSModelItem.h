@@ -6,7 +6,7 @@
 class KSModelAttributeItem;
 class KSModelDataItem;
 
-// One node of a tree, with its links up, down and to both sides. A node owns its children.
+// One node of a tree with links to its parent, children and siblings. A node owns its children.
 class KSModelItem
 {
 public:
@@ -19,31 +19,33 @@ public:
     virtual KSModelDataItem* dataItem() = 0;
 
     virtual KSModelItem* root() const = 0;
-    // Of this node and all below it.
+    // Sets the root of this node and of all nodes below it.
     virtual void setRoot(KSModelItem* root) = 0;
     virtual KSModelItem* parent() const = 0;
-    // The link alone; addChild and the others keep it by themselves.
+    // Sets only the link; addChild and the other functions call it themselves.
     virtual void setParent(KSModelItem* parent) = 0;
 
-    // Null outside the list.
+    // Returns null if there is no such row.
     virtual KSModelItem* child(int row) const = 0;
     virtual int childCount() const = 0;
-    // deep: also the children's children, each behind its parent.
+    // If deep is true, includes all descendants, each after its parent.
     virtual QList<KSModelItem*> children(bool deep) const = 0;
     virtual KSModelItem* next() const = 0;
     virtual KSModelItem* prev() const = 0;
 
-    // Beside this node, which must have a parent; without one the item is deleted and null given back.
+    // Insert the item after or before this node. If this node has no parent, they delete the item and return
+    // null.
     virtual KSModelItem* insertNext(std::unique_ptr<KSModelItem> item) = 0;
     virtual KSModelItem* insertPrev(std::unique_ptr<KSModelItem> item) = 0;
-    // A row outside the list appends. Null is ignored.
+    // Appends the item if there is no such row. Null is ignored.
     virtual KSModelItem* addChild(std::unique_ptr<KSModelItem> item, int row = -1) = 0;
-    // Takes a child out; null outside the list.
+    // Removes and returns a child; null if there is no such row.
     virtual std::unique_ptr<KSModelItem> remove(int row) = 0;
-    // Takes this node out of its parent; null without one.
+    // Removes this node from its parent and returns it; null without a parent.
     virtual std::unique_ptr<KSModelItem> removeSeft() = 0;
-    // -1 for a stranger.
+    // Returns -1 if the item is not a child of this node.
     virtual int indexOfChildList(const KSModelItem* item) const = 0;
-    // Puts the children in this order, which must hold each of them once; false and no change otherwise.
+    // Reorders the children. order must contain each child exactly once; otherwise nothing changes and false
+    // is returned.
     virtual bool orderChildList(const QList<KSModelItem*>& order) = 0;
 };

@@ -77,7 +77,7 @@ std::unique_ptr<KSModelItem> KSModelTreeDataItem::removeSeft()
 
 int KSModelTreeDataItem::indexOfChildList(const KSModelItem* item) const
 {
-    // A view asks for one row after the other.
+    // A view asks for the rows in order, so begin where the last search ended.
     for (size_t ahead = 0; ahead < m_children.size(); ++ahead) {
         const size_t row = (m_lastFound + ahead) % m_children.size();
         if (m_children[row].get() == item) {

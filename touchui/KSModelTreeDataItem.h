@@ -7,7 +7,7 @@
 #include <QHash>
 #include <vector>
 
-// The one node type of KSTreeModel.
+// The node class of KSTreeModel.
 class KSModelTreeDataItem : public KSModelItem, public KSModelDataItem, public KSModelAttributeItem
 {
 public:
@@ -54,8 +54,8 @@ private:
     KSModelItem* m_root = nullptr;
     KSModelItem* m_parent = nullptr;
     std::vector<std::unique_ptr<KSModelItem>> m_children;
-    mutable size_t m_lastFound = 0; // where the last search for a child ended; searches come in order
+    mutable size_t m_lastFound = 0; // row of the last result of indexOfChildList()
     void* m_sourceData = nullptr;
     bool m_childrenCreated = false;
-    QHash<int, QList<QVariant>> m_attributes; // by role; max key plus one values
+    QHash<int, QList<QVariant>> m_attributes; // key: role; a list has max key + 1 values
 };

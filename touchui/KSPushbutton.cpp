@@ -112,7 +112,7 @@ void KSPushbutton::setTextMargin(int margin)
     update();
 }
 
-// A button that is switched off or on keeps its row and takes the matching column.
+// Disabling and enabling keep the button selected or unselected and select the matching state.
 void KSPushbutton::changeEvent(QEvent* event)
 {
     if (event->type() == QEvent::EnabledChange) {
@@ -156,7 +156,7 @@ const QPixmap& KSPushbutton::slice(int index)
 
 void KSPushbutton::drawImage(QPainter& painter, _enumButtonState state)
 {
-    const int first = state * SLICES_PER_STATE + 1; // after the folder
+    const int first = state * SLICES_PER_STATE + 1; // skip the folder
     const QPixmap& left = slice(first);
     const QPixmap& center = slice(first + 1);
     const QPixmap& right = slice(first + 2);
@@ -181,7 +181,7 @@ void KSPushbutton::drawIcon(QPainter& painter)
     }
     const QRect area(QPoint((width() - iconSize().width()) / 2, (height() - iconSize().height()) / 2),
                      iconSize());
-    // A disabled look is a picture of its own here, not one that Qt computes.
+    // The owner sets a separate picture for the disabled state; Qt must not compute one.
     icon().paint(&painter, area, Qt::AlignCenter, QIcon::Normal, QIcon::Off);
 }
 
@@ -191,7 +191,7 @@ void KSPushbutton::drawText(QPainter& painter)
         return;
     }
     const bool disabled = m_paintedState == ButtonDisabled || m_paintedState == ButtonSelectedDisabled;
-    // Bright on the dark pictures, unless the owner chose another colour.
+    // Bright text on the dark pictures, unless the owner has set another colour.
     const bool chosen = palette().isBrushSet(QPalette::Active, QPalette::ButtonText);
     const QColor ink = chosen ? palette().color(QPalette::Active, QPalette::ButtonText) : TEXT;
     painter.setPen(disabled ? DISABLED_TEXT : ink);

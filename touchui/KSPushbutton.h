@@ -7,14 +7,14 @@
 
 class QPainter;
 
-// A touch button that paints itself from pictures: three slices, left, centre and right, for each state.
+// A touch button that is painted from pictures: three slices, left, centre and right, for each state.
 //
 // The picture string is "<folder>:<left>:<centre>:<right>:..." with three names for each state in the order
-// of _enumButtonState; a name stands for ":/<folder>/<name>", an empty one leaves its slice undrawn. Over the
-// slices come the background picture, the icon, the movable picture and the text.
+// of _enumButtonState; a name stands for ":/<folder>/<name>", and the slice of an empty name is not drawn.
+// The background picture, the icon, the movable picture and the text are drawn over the slices.
 //
-// pressed(int) and signalReleased(bool, int) of this class hide those of its bases; connect those through the
-// base.
+// pressed(int) and signalReleased(bool, int) hide signals of the base classes; connect those through the base
+// class.
 class KSPushbutton : public TouchEventButton
 {
     Q_OBJECT
@@ -30,7 +30,7 @@ public:
     };
     using enumButtonState = _enumButtonState;
 
-    // The picture string of the standard button, 48 pixels high.
+    // The picture string of the standard button, which is 48 pixels high.
     static constexpr char STANDARD_IMAGES[] =
         "TextToolPanel_Buttons:Button_48_Rest_Left:Button_48_Rest_Center:Button_48_Rest_Right:"
         "Button_48_Pressed_Left:Button_48_Pressed_Center:Button_48_Pressed_Right:"
@@ -43,28 +43,28 @@ public:
     KSPushbutton(const QString& images, const QString& text, QWidget* parent = nullptr);
     explicit KSPushbutton(QWidget* parent = nullptr);
 
-    // Out of range is ignored.
+    // Ignored if state is out of range.
     void changeButtonState(_enumButtonState state);
     void changeButtonState(int state);
     _enumButtonState buttonState() const { return m_state; }
-    // What is on the screen: follows the state unless auto state is off.
+    // Returns the state that is shown: the current state unless auto state is off.
     _enumButtonState paintedState() const { return m_paintedState; }
-    // While off, the button goes on showing the state it showed.
+    // If false, the button keeps showing its present state.
     void setAutoState(bool autoState);
 
-    // Moves between the plain and the selected row and keeps the rest of the state.
+    // Changes between the normal and the selected variant of the state.
     void setSelected(bool selected);
     bool isSelected() const { return m_state >= ButtonSelectedRest; }
 
     void setImage(const QString& images);
     void setMovableImage(const QPixmap& image, const QPoint& position = QPoint());
     void setBackgroudImage(const QPixmap& image);
-    // Frees the slices, the movable and the background picture.
+    // Frees the slices, the movable picture and the background picture.
     void cleanImages();
 
     void setTextAlignment(Qt::Alignment alignment);
     Qt::Alignment textAlignment() const { return m_textAlignment; }
-    // Distance of the text from the left and right edge, in pixels.
+    // Sets the distance of the text from the left and right edge in pixels.
     void setTextMargin(int margin);
     int textMargin() const { return m_textMargin; }
     void setButtonId(int id) { m_buttonId = id; }
@@ -86,7 +86,7 @@ private:
     const QPixmap& slice(int index);
 
     QStringList m_imageNames;
-    QList<QPixmap> m_slices; // loaded at first use, in the order of the names
+    QList<QPixmap> m_slices; // loaded on first use, in the order of the names
     _enumButtonState m_state = ButtonRest;
     _enumButtonState m_paintedState = ButtonRest;
     bool m_autoState = true;

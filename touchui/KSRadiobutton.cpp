@@ -91,7 +91,7 @@ void KSRadiobutton::sendMouse(QEvent::Type type, const QPointF& position)
     }
 }
 
-// The button comes up and nothing is chosen.
+// Releases the button without choosing it.
 void KSRadiobutton::comeUp()
 {
     sendMouse(QEvent::MouseMove, OUTSIDE);

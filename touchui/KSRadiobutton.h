@@ -8,8 +8,8 @@
 
 #include <array>
 
-// A radio button for one finger, painted from the pictures under ":/KSRadioButton" or another folder:
-// Radiobutton_On_Rest, Radiobutton_On_Pressed, Radiobutton_On_Disabled and the same with Off.
+// A radio button that is operated with one finger and painted from the pictures under ":/KSRadioButton" or
+// another folder: Radiobutton_On_Rest, Radiobutton_On_Pressed, Radiobutton_On_Disabled and the same with Off.
 class KSRadiobutton : public QRadioButton
 {
     Q_OBJECT
@@ -17,7 +17,7 @@ public:
     explicit KSRadiobutton(QWidget* parent = nullptr);
     explicit KSRadiobutton(const QString& text, QWidget* parent = nullptr);
 
-    // A resource folder with pictures of those names.
+    // Sets a resource folder with pictures of those names.
     void setImagesPath(const QString& folder);
 
     QSize sizeHint() const override;
@@ -34,6 +34,6 @@ private:
     void comeUp();
     QSize pictureSize() const;
 
-    std::array<std::array<QPixmap, 3>, 2> m_pictures; // off and on; rest, pressed, disabled
+    std::array<std::array<QPixmap, 3>, 2> m_pictures; // first index: off, on; second: rest, pressed, disabled
     OneFinger m_finger{this};
 };

@@ -183,7 +183,7 @@ void KSSLider::mouseMoveEvent(QMouseEvent* event)
 void KSSLider::mouseReleaseEvent(QMouseEvent* event)
 {
     if (m_pressed && event->button() != Qt::LeftButton) {
-        event->ignore(); // another button, while the left one is held
+        event->ignore(); // another button was released while the left one is held
         return;
     }
     if (m_dragging) {
@@ -194,7 +194,7 @@ void KSSLider::mouseReleaseEvent(QMouseEvent* event)
     letGo();
 }
 
-// Ends a press, wherever the handle is now.
+// Ends the current press and leaves the handle where it is.
 void KSSLider::letGo()
 {
     if (m_dragging) {
@@ -210,7 +210,7 @@ void KSSLider::letGo()
     }
 }
 
-// The position is where the handle's centre should be.
+// position is that of the handle's centre.
 int KSSLider::valueAt(const QPoint& position) const
 {
     QStyleOptionSlider option;

@@ -9,11 +9,12 @@
 
 class KSSliderStyle;
 
-// A slider for one finger: touches become mouse events of the slider, its handle keeps its distance to the
-// finger, and a balloon tells the value while it is held. Positions are in widget coordinates.
+// A slider that is operated with one finger: touches are converted to mouse events, the handle keeps its
+// distance to the finger, and a balloon shows the value while the handle is held. Positions are in widget
+// coordinates.
 //
 // The image string is "<folder>:<handle at rest>:<pressed>:<disabled>:<groove left>:<centre>:<right>"; a name
-// stands for ":/<folder>/<name>". A vertical slider takes the last three as top, centre and bottom.
+// stands for ":/<folder>/<name>". For a vertical slider the last three are top, centre and bottom.
 class KSSLider : public QSlider
 {
     Q_OBJECT
@@ -22,36 +23,36 @@ public:
     explicit KSSLider(const QString& images, Qt::Orientation orientation = Qt::Horizontal,
                       QWidget* parent = nullptr);
 
-    // Takes new pictures; an empty string the plain look.
+    // Sets the pictures; an empty string selects the plain look.
     void Initialization(const QString& images, Qt::Orientation orientation = Qt::Horizontal);
 
-    // Marks at each interval of the range; 0 or less takes them off.
+    // Shows marks at each interval of the range; 0 or less removes them.
     void setTick(int interval, QSlider::TickPosition position = QSlider::TicksBelow);
-    // The mark of a value; null without marks.
+    // Returns the mark of a value; null without marks.
     QRect getTickRect(int value) const;
     QRect handleRect() const;
 
-    // While off, presses do nothing; the look stays.
+    // If false, presses have no effect; the look does not change.
     void setReponse(bool response);
     bool response() const { return m_response; }
 
-    // Asks for the balloon's text with signalDrawTip. Without a receiver the balloon tells the value.
+    // Requests the balloon's text with signalDrawTip. Without a receiver the balloon shows the value.
     void ShowTip();
-    // Shows the text in the balloon at the handle; an empty one hides it.
+    // Shows the text in the balloon at the handle; an empty text hides the balloon.
     void DrawTipText(const QString& text);
 
     QSize sizeHint() const override;
     QSize minimumSizeHint() const override;
 
 Q_SIGNALS:
-    // The handle is held and its balloon is due: a receiver calls DrawTipText.
+    // Emitted when the balloon is to be shown for the held handle; a receiver calls DrawTipText.
     void signalDrawTip(KSSLider* slider);
     void signalDrawTipText(QString text);
     void signalMousePressed();
     void signalMouseRelease();
 
 protected:
-    // Widens what counts as a press on the handle.
+    // Enlarges the area in which a press takes the handle.
     virtual void changeHandleRect(QRect& rect) const;
 
     bool event(QEvent* event) override;
@@ -68,10 +69,10 @@ private:
     void letGo();
     int valueAt(const QPoint& position) const;
 
-    KSSliderStyle* m_style; // child of this
+    KSSliderStyle* m_style; // child of this object
     OneFinger m_finger{this};
     bool m_response = true;
-    bool m_pressed = false;  // press and release signals come in pairs
+    bool m_pressed = false;  // so that press and release signals come in pairs
     bool m_dragging = false; // the handle is held
-    QPoint m_clickOffset;    // from the handle's centre to the press
+    QPoint m_clickOffset;    // vector from the handle's centre to the press
 };

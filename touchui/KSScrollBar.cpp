@@ -29,7 +29,7 @@ bool KSScrollBar::event(QEvent* event)
     return event->type() == QEvent::ContextMenu || m_finger.takes(event) || QScrollBar::event(event);
 }
 
-// The place of a press or move is cut to whole pixels, that of a lift is rounded.
+// Positions of a press or move are truncated to whole pixels, that of a lift is rounded.
 void KSScrollBar::followFinger(QEvent::Type type)
 {
     const QPointF exact = m_finger.positionIn(this);

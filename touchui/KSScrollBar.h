@@ -8,7 +8,7 @@
 
 class QPainter;
 
-// A scroll bar that paints itself from pictures and that a finger works like a mouse. GUI thread only.
+// A scroll bar that is painted from pictures and operated with a finger or the mouse. GUI thread only.
 class KSScrollBar : public QScrollBar
 {
     Q_OBJECT
@@ -17,10 +17,10 @@ public:
     explicit KSScrollBar(Qt::Orientation orientation, QWidget* parent = nullptr);
 
     bool isPressed() const { return m_pressed; }
-    // In widget coordinates.
+    // Returns the rectangle of the handle in widget coordinates.
     QRect handleRect() const;
 
-    // The rectangle is the handle's, in widget coordinates.
+    // handle is the rectangle of the handle in widget coordinates.
     virtual void paintHorizontal(QPainter* painter, QRect& handle);
     virtual void paintVertical(QPainter* painter, QRect& handle);
 
@@ -32,7 +32,7 @@ protected:
     void keyReleaseEvent(QKeyEvent* event) override;
 
 private:
-    // Ends, centre and the grip over its middle.
+    // The pictures of a handle: both ends, the centre, and the grip drawn over its middle.
     struct Handle {
         QPixmap first;
         QPixmap center;
@@ -48,7 +48,7 @@ private:
 
     OneFinger m_finger{this};
     bool m_pressed = false;
-    Handle m_handles[2]; // at rest and pressed; loaded at first use
+    Handle m_handles[2]; // at rest and pressed; loaded on first use
     QPixmap m_base;
     bool m_loaded[2] = {false, false};
 };

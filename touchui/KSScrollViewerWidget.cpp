@@ -43,7 +43,7 @@ KSScrollViewerWidget::KSScrollViewerWidget(QWidget* parent)
     setStyleSheet(s_scrollBarStyle);
     setAttribute(Qt::WA_AcceptTouchEvents);
     viewport()->setAttribute(Qt::WA_AcceptTouchEvents);
-    // Only what is opaque is scrolled on the screen without being painted again.
+    // When scrolling, Qt copies the pixels of an opaque viewport instead of painting it again.
     viewport()->setAttribute(Qt::WA_OpaquePaintEvent);
     setWidget(m_board->panel());
     buildBars();
@@ -237,7 +237,7 @@ void KSScrollViewerWidget::addRows(std::vector<std::unique_ptr<ScrollViewerRow>>
     adjustLayout();
 }
 
-// The place that was kept for it is its own, as a rule.
+// Lays the items out again only if the new widget has another height than was reserved for it.
 void KSScrollViewerWidget::itemMade(KSBaseItemWidget* item)
 {
     const int height = item->height();
@@ -333,7 +333,7 @@ void KSScrollViewerWidget::removeAll()
     removeWidgetItems(0, count());
 }
 
-// Only what is left of it, a QObject.
+// Only the QObject part of the item still exists.
 void KSScrollViewerWidget::itemGone(QObject*)
 {
     adjustLayout();
@@ -420,7 +420,7 @@ QPoint KSScrollViewerWidget::toBoard(const QPoint& pos) const
     return m_board->board()->mapFrom(this, pos);
 }
 
-// With items of no fixed size a relayout resizes them, and they ask for one in turn.
+// The guard prevents recursion: a layout resizes items without a fixed size, and these request a layout.
 void KSScrollViewerWidget::adjustLayout()
 {
     if (m_layingOut)
@@ -547,7 +547,7 @@ void KSScrollViewerWidget::paintEvent(QPaintEvent* event)
 
 void KSScrollViewerWidget::scrollContentsBy(int dx, int dy)
 {
-    viewport()->scroll(dx, dy); // with all that lies on it, if it shows anything
+    viewport()->scroll(dx, dy); // also moves the child widgets
     placeBar();
     QScrollArea::scrollContentsBy(dx, dy);
 }
@@ -583,7 +583,7 @@ void KSScrollViewerWidget::slotChangeScrollBarStyle(int minimum, int maximum)
                   "center;width: 20px}")
             : QStringLiteral("QScrollBar::handle:vertical {background-image: url(:/control);"
                              "background-position: center;width: 14px}");
-    // Repeating the last rule would change nothing but the length.
+    // Do not repeat the last rule, which would only make the style sheet longer.
     if (!s_scrollBarStyle.endsWith(part))
         s_scrollBarStyle += part;
 }
@@ -612,7 +612,7 @@ bool KSScrollViewerWidget::eventFilter(QObject* object, QEvent* event)
         return true;
     }
     if (object == m_board->board() && event->type() == QEvent::LayoutRequest)
-        adjustLayout(); // an item wants another size
+        adjustLayout(); // an item requests another size
     if (event->type() == QEvent::Gesture)
         return object == this || object == viewport();
     if (OneFinger::isTouch(event))
@@ -639,8 +639,7 @@ bool KSScrollViewerWidget::handleVScrollBarEvent(QEvent* event)
     }
 }
 
-// Beside the handle the list jumps, so that the handle comes under the press and can be dragged on from
-// there.
+// A press beside the handle moves the handle under the press, so that it can be dragged from there.
 void KSScrollViewerWidget::handleScrollBarPressedEvent(QEvent* event)
 {
     slotScrollBarSliderPressed();

@@ -20,60 +20,61 @@ class KSScrollBar;
 class QTouchEvent;
 class ScrollViewerBoard;
 
-// A vertical list of items for one finger, which taps or holds an item, scrolls the list and flicks it on,
-// or, by an item's handle, lifts the item out and drops it at another place.
+// A vertical list of items that is operated with one finger: a tap or a hold on an item, a drag or a flick of
+// the list, or a drag of an item by its handle to another position.
 //
-// Every kind of press is told by a signal with the item (null in empty area), a position and this list.
-// Positions in signals are the item's, or this widget's when there is no item. A mouse does the same as a
-// finger, but its list follows at once and does not run on. Items belong to the list as its descendants; one
-// that is removed stays hidden as such, so that it can be put back. GUI thread only.
+// Each kind of press is reported by a signal with the item (null for an empty area), a position and this
+// list. Positions in signals are in coordinates of the item, or of this widget if there is no item. The mouse
+// works in the same way, but the list follows it directly and does not glide. Items are descendants of the
+// list and owned by it; a removed item remains a hidden descendant, so that it can be added again. GUI thread
+// only.
 class KSScrollViewerWidget : public QScrollArea
 {
     Q_OBJECT
 public:
-    // Where a lifted item floats. Not owned; null: the window of the list.
+    // The parent of a lifted item. Not owned; if null, the window of the list.
     static QPointer<QWidget> s_mainWnd;
-    // The style sheet of the next list that is made.
+    // The style sheet of lists that are created later.
     static QString s_scrollBarStyle;
 
     explicit KSScrollViewerWidget(QWidget* parent = nullptr);
     ~KSScrollViewerWidget() override;
 
-    // Fixes the size of the list; 543 by 998 at first.
+    // Fixes the size of the list in pixels; the default is 543 by 998.
     void setSize(int width, int height);
 
     virtual int getSpacingBetweenItemAndScrollbar() const;
-    // Left or right; others are ignored.
+    // Accepts left and right; other values are ignored.
     virtual void setVScrollBarAlignment(Qt::Alignment alignment);
     virtual void setSpacingBetweenItems(int spacing);
     virtual void setMargins(QMargins margins);
     virtual void setMargins(int left, int top, int right, int bottom);
-    // For items that have none of their own.
+    // Applies to items that have no alignment of their own.
     virtual void setItemsDragFlagAlignment(DragFlagAlignment alignment)
     {
         m_touch.setDragAlignment(alignment);
     }
-    // The bar shows only while there is something to scroll to.
+    // If true, the bar is visible only while the list can be scrolled.
     virtual void setScrollBarAutoShow(bool autoShow);
     virtual void setHasSeparator(bool hasSeparator);
     virtual void setSpacingBetweenItemAndScrollbar(int spacing);
-    // -1 or an index beyond the end appends. Null, and items that are in the list already, are ignored.
+    // An index of -1 or beyond the end appends. Null and items that are already in the list are ignored.
     virtual void addWidgetItem(KSBaseItemWidget* item, int index);
-    // The list object stays the caller's.
+    // The caller keeps the QList object.
     virtual void addWidgetItems(QList<KSBaseItemWidget*>* items, int index);
-    // Rows whose widgets are made when they come into view or are asked for: only getWidgetItem and
-    // getWidgetItems ask. An index as above.
+    // Adds rows whose widgets are created when they become visible or are requested by getWidgetItem or
+    // getWidgetItems. index as above.
     void addRows(std::vector<std::unique_ptr<ScrollViewerRow>> rows, int index);
-    // Takes rows out whose indexes rise. What is in view stays where it is.
+    // Removes rows; indexes must be ascending. The visible rows keep their position on the screen.
     void removeRows(const QList<int>& indexes);
-    // Takes away the widget of a row that was added without one; the row makes another one when it needs one.
-    // The widget stays a hidden descendant of the list, for the caller to delete. False, and nothing happens,
-    // when it is in view, in use by a finger or the row's own.
+    // Removes the widget of a row that was added by addRows; the row creates another one when it is needed.
+    // The widget remains a hidden descendant of the list; the caller may delete it. Returns false, without
+    // any effect, if the widget is visible, used by a finger, or was added by addWidgetItem.
     bool giveBackWidgetItem(KSBaseItemWidget* item);
-    // The item is hidden and stays a descendant of the list. What is not in the list is ignored.
+    // Hides the item, which remains a descendant of the list. Ignores items that are not in the list.
     virtual void removeWidgetItem(KSBaseItemWidget* item);
     virtual void removeWidgetItem(int index);
-    // So many items from the one on; more than there are means all of them.
+    // Remove count items beginning with this one; a larger count removes all that follow.
     virtual void removeWidgetItems(int index, int count);
     virtual void removeWidgetItems(KSBaseItemWidget* item, int count);
     virtual void removeAll();
@@ -81,17 +82,17 @@ public:
     virtual void swap(int first, int second);
     virtual int count() const;
     virtual bool isEmpty() const;
-    // Scrolls so that the item is the topmost one, as far as the range goes.
+    // Scrolls the item to the top, as far as the range allows.
     virtual void moveToWidgetItem(int index);
     virtual void moveToWidgetItem(KSBaseItemWidget* item);
-    // Scrolls so that the item is the lowest one.
+    // Scrolls the item to the bottom.
     virtual void setLastVisibleItem(int index);
     virtual void setLastVisibleItem(KSBaseItemWidget* item);
-    // The widget that floats under the finger; null when nothing is lifted.
+    // Returns the widget that floats under the finger; null if no item is lifted.
     virtual KSBaseItemWidget* getMoveItem() const { return m_touch.movingWidget(); }
-    // Switched off, the list does not follow the finger that is down; the next touch switches it on.
+    // If false, the list does not follow the current finger; the next touch enables following again.
     virtual void setFlickAbility(bool ability) { m_touch.flicker().setAble(ability); }
-    // Presses beside it, in widget coordinates, select nothing.
+    // Sets the horizontal range in widget coordinates outside of which presses select no item.
     virtual void setHEffectiveArea(int left, int width) { m_touch.setEffectiveArea(left, width); }
     virtual void onTranslateTouchEventToMouse(QObject*, QTouchEvent*) { m_touch.passOnAsMouse(); }
     virtual void onTranslateTouchBeginEventToMouse(QObject*, QTouchEvent*, QPoint& pos)
@@ -106,9 +107,9 @@ public:
     {
         m_touch.fingerLifted(pos);
     }
-    // Follows the finger. True when the event belongs to the motion and goes no further.
+    // Follows the finger. Returns whether the event belongs to a scroll motion and needs no further handling.
     virtual bool onTouchEvent(QObject*, QTouchEvent*) { return m_touch.followMotion(); }
-    // One tick: how far the contents move.
+    // Calculates one tick; returns the distance by which the contents move.
     virtual QPointF getDistance() { return m_touch.getDistance(); }
     virtual void setAutoFlick(bool autoFlick) { m_touch.flicker().setGliding(autoFlick); }
     virtual void setStartPoint(const QPointF& point) { m_touch.flicker().setStart(point); }
@@ -116,44 +117,44 @@ public:
     virtual bool isFlickEnd() const { return m_touch.flicker().isEnd(); }
     virtual bool hasFlicked() const { return m_touch.flicker().hasFlicked(); }
     virtual void stopFlick() { m_touch.flicker().stop(); }
-    // The list runs on after the finger has left.
+    // Returns whether the list glides after the lift.
     virtual bool isAutoFilck() const { return m_touch.flicker().isGliding(); }
     virtual bool flickAbility() const { return m_touch.flicker().isAble(); }
 
     KSBaseItemWidget* getWidgetItem(int index) const;
-    // Null when there is no such row or its widget is not made.
+    // Returns null if there is no such row or its widget was not created.
     KSBaseItemWidget* madeWidgetItem(int index) const;
-    // What the widget of a row is made from; null for a row that was added with its widget. Ends with the
-    // row.
+    // Returns the object that creates the widget of a row; null for a row that was added with its widget.
+    // Owned by the row.
     ScrollViewerRow* row(int index) const;
-    // In widget coordinates; null in a gap.
+    // pos is in widget coordinates; returns null in a gap.
     KSBaseItemWidget* getWidgetItem(QPoint pos) const;
     int getIndexOfWidgetItem(const KSBaseItemWidget* item) const;
     QList<KSBaseItemWidget*> getWidgetItems(int index, int count) const;
-    // In widget coordinates.
+    // rect is in widget coordinates.
     QList<KSBaseItemWidget*> getWidgetItems(QRect rect) const;
-    // In board coordinates.
+    // rect is in board coordinates.
     QList<KSBaseItemWidget*> getItemsIntersectRect(QRect rect) const;
-    // What is to be seen, in board coordinates.
+    // Returns the visible rectangle in board coordinates.
     QRect calculateVisibleRect() const;
-    // The index of an item that is inserted at this place, in widget coordinates.
+    // Returns the index for an item that is inserted at this position, in widget coordinates.
     int getInsertPos(QPoint pos) const;
-    // The item of the last press.
+    // Returns the item of the last press.
     KSBaseItemWidget* getSelectedItem() const { return m_touch.pressedItem(); }
-    // Items that are at least partly to be seen; -1 when there are none.
+    // Return the first and last item that are at least partly visible; -1 if there are none.
     int firstVisibleItem() const { return m_firstVisible; }
     int lastVisibleItem() const { return m_lastVisible; }
     bool isMove() const { return m_touch.flicker().isMove(); }
     bool isDragging() const { return m_touch.isDragging(); }
-    // Restarts those timers of press and drag that run.
+    // Restarts the press and drag timers that are running.
     void allTimersReset();
     void stopTapAndHoldTimer() { m_touch.stopHold(); }
     KSScrollBar* getVScrollBar() const { return m_bar; }
     Qt::Alignment getVScrollBarAlignment() const { return m_barAlignment; }
     bool getHasSeparator() const { return m_hasSeparator; }
-    // Gives the old one.
+    // Returns the status that was set before.
     bool setMinitrimStatus(bool status) { return m_touch.setMinitrimStatus(status); }
-    // While set, a touch is left to the item under it.
+    // While set, the list does not handle touches that begin, but leaves them to the item under the finger.
     void setIsTake(bool isTake) { m_touch.setIsTake(isTake); }
     bool itemsCanDrag() const { return m_touch.itemsCanDrag(); }
 
@@ -173,26 +174,27 @@ public Q_SLOTS:
     void slotShowPopupItem() { m_touch.startDrag(); }
 
 Q_SIGNALS:
-    // A tap on an item.
+    // Emitted for a tap on an item.
     void widgetItemClicked(KSBaseItemWidget* item, QPoint pos, KSScrollViewerWidget* scrollArea);
     void widgetItemPressed(KSBaseItemWidget* item, QPoint pos, KSScrollViewerWidget* scrollArea);
-    // The end of a press without motion.
+    // Emitted at the end of a press without motion.
     void widgetItemReleased(KSBaseItemWidget* item, QPoint pos, KSScrollViewerWidget* scrollArea);
     void widgetItemLongHold(KSBaseItemWidget* item, QPoint pos, KSScrollViewerWidget* scrollArea);
-    // For subclasses; not emitted here.
+    // For subclasses; never emitted here.
     void widgetItemPressedAndHold(KSBaseItemWidget* item, QPoint pos, KSScrollViewerWidget* scrollArea,
                                   bool& willFlick);
     void widgetItemRightPressed(KSBaseItemWidget* item, QPoint pos, KSScrollViewerWidget* scrollArea);
-    // Before the item leaves the list.
+    // Emitted before the lifted item leaves the list.
     void signalDragOneItem(KSBaseItemWidget* item, int index, KSScrollViewerWidget* scrollArea);
-    // A press on an item has become a motion. Who sets willFlick makes it one that ends in no tap.
+    // Emitted when a press on an item becomes a motion. If a receiver sets willFlick, the press does not end
+    // as a tap.
     void signalFlick(KSBaseItemWidget* item, QPoint pos, KSScrollViewerWidget* scrollArea, bool& willFlick);
     void minitrimStop();
     void signalVisibleItemsChange();
-    // After a drop, when all items have their places.
+    // Emitted after a drop, when all items have their positions.
     void signalItemDrop();
     void widgetItemMouseMove(KSBaseItemWidget* item, QPoint pos, KSScrollViewerWidget* scrollArea);
-    // The end of a press with motion.
+    // Emitted at the end of a press with motion.
     void widgetItemChangeColor(KSBaseItemWidget* item, QPoint pos, KSScrollViewerWidget* scrollArea);
 
 protected:
@@ -203,13 +205,13 @@ protected:
     void keyPressEvent(QKeyEvent* event) override;
     void resizeEvent(QResizeEvent* event) override;
     void paintEvent(QPaintEvent* event) override;
-    // Moves what is on screen already and paints the rest only.
+    // Moves the pixels on the screen and paints only the rest.
     void scrollContentsBy(int dx, int dy) override;
-    // A hidden list has no finger on it.
+    // Ends the current press: a hidden list receives no further touch events.
     void hideEvent(QHideEvent* event) override;
     bool focusNextPrevChild(bool next) override;
 
-    // A subclass may start it.
+    // For subclasses; not started here.
     TouchTimer m_stretchTimer;
 
 private:

@@ -13,7 +13,7 @@ constexpr QSize PLAIN_HANDLE(44, 44);
 constexpr int PLAIN_GROOVE = 12;
 constexpr int TICK_LENGTH = 8;
 constexpr int TICK_WIDTH = 2;
-constexpr int MOST_TICKS = 200; // more would be a grey bar
+constexpr int MOST_TICKS = 200; // more marks would look like a grey bar
 constexpr qreal DISABLED_OPACITY = 0.4;
 const QColor PLAIN_COLOR(102, 102, 102);
 const QColor PLAIN_GROOVE_COLOR(30, 30, 30);
@@ -34,7 +34,7 @@ int bandAfter(const QStyleOptionSlider& option)
     return option.tickPosition & QSlider::TicksBelow ? KSSliderStyle::TICK_BAND : 0;
 }
 
-// The strip in which handle and groove lie, without the bands of the marks.
+// Returns the strip for handle and groove, without the bands of the marks.
 QRect strip(const QStyleOptionSlider& option)
 {
     const int before = bandBefore(option);
@@ -112,7 +112,7 @@ void KSSliderStyle::drawHandle(const QStyleOptionSlider& option, QPainter& paint
         painter.fillRect(target, PLAIN_COLOR);
         return;
     }
-    // The pictures have no disabled look of their own.
+    // A disabled handle is drawn with reduced opacity, because the pictures for it do not look disabled.
     painter.save();
     painter.setOpacity(look == 2 ? DISABLED_OPACITY : 1.0);
     painter.drawPixmap(target, picture);

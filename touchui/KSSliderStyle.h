@@ -7,13 +7,13 @@
 
 class QStyleOptionSlider;
 
-// How a KSSLider looks and where its parts are. Parts without a picture are painted plainly.
+// Paints a KSSLider and defines the positions of its parts. Parts without a picture are painted plainly.
 class KSSliderStyle : public QProxyStyle
 {
     Q_OBJECT
 public:
     struct Images {
-        std::array<QPixmap, 3> handle; // rest, pressed, disabled
+        std::array<QPixmap, 3> handle; // at rest, pressed, disabled
         std::array<QPixmap, 3> groove; // left, centre, right; or top, centre, bottom
     };
 
@@ -30,10 +30,11 @@ public:
     int styleHint(StyleHint hint, const QStyleOption* option = nullptr, const QWidget* widget = nullptr,
                   QStyleHintReturn* returnData = nullptr) const override;
 
-    // In widget coordinates: the mark of a value, under or over (beside) the groove; null without marks.
+    // Returns the mark of a value, above or below (or beside) the groove, in widget coordinates; null without
+    // marks.
     QRect tickRect(const QStyleOptionSlider& option, int value) const;
     QSize handleSize() const;
-    // Height of the band of marks on one side of the slider.
+    // Height in pixels of the band of marks on one side of the slider.
     static constexpr int TICK_BAND = 14;
 
 private:

@@ -2,15 +2,15 @@
 
 #include <QEvent>
 
-// Tells the focused text item of the canvas where the soft keyboard has put the cursor or the selection.
-// Positions are character positions in the item's document and come from another process: the receiver clamps
-// them.
+// Reports the cursor position or the selection of the soft keyboard to the focused text item of the canvas.
+// Positions are character positions in the item's document. They come from another process, so the receiver
+// must clamp them.
 class KSSoftKeyboardCursorSettingEvent : public QEvent
 {
 public:
     static const QEvent::Type myType;
 
-    // Mode 0 puts the cursor at current, 1 selects begin to end, 2 selects all.
+    // Mode 0 puts the cursor at current, 1 selects from begin to end, 2 selects all.
     KSSoftKeyboardCursorSettingEvent(int begin, int end, int current, int mode);
 
     int getCursorBeginPos() const { return m_begin; }

@@ -66,7 +66,7 @@ void KSTabBar::setTabSizeHint(int index, const QSize& size)
         return;
     }
     m_sizes[index] = size;
-    // The base lays its tabs out again only when one of them changes.
+    // The base class updates its layout only when a tab changes.
     setTabText(index, tabText(index) + QLatin1Char(' '));
     setTabText(index, tabText(index).chopped(1));
     updateGeometry();

@@ -8,8 +8,8 @@
 
 class KSTabStyle;
 
-// A tab bar for one finger: tabs have the size they are told and change on the lift, so that a finger that
-// slides off changes nothing.
+// A tab bar that is operated with one finger: tabs have settable sizes and change on the lift, so that a
+// finger that slides off changes nothing.
 class KSTabBar : public QTabBar
 {
     Q_OBJECT
@@ -19,14 +19,15 @@ public:
     static constexpr int TEXT_PIXELS = 24;
     static constexpr int TAB_HEIGHT = 52;
 
-    // Overrides the size of a tab; an invalid size takes the text's again. An index without a tab is ignored.
+    // Sets the size of a tab in pixels; an invalid size restores that of its text. Ignored if there is no
+    // such tab.
     void setTabSizeHint(int index, const QSize& size);
     QSize sizeHint() const override;
     QSize minimumSizeHint() const override { return sizeHint(); }
 
-    // See KSTabStyle.
+    // Sets the pictures, see KSTabStyle.
     void setImages(const QString& images);
-    // The tab under the finger, -1 for none.
+    // Returns the tab under the finger, or -1.
     int pressedTab() const { return m_pressedTab; }
 
 protected:
@@ -49,9 +50,9 @@ private:
     QSize textSize(int index) const;
     bool isUpright() const;
 
-    KSTabStyle* m_style;   // child of this
-    QList<QSize> m_sizes;  // of each tab; invalid: that of its text
-    int m_pressStart = -1; // the tab that the press began on
-    int m_pressedTab = -1; // the same while the finger is on it
+    KSTabStyle* m_style;   // child of this object
+    QList<QSize> m_sizes;  // of each tab; invalid for the size of its text
+    int m_pressStart = -1; // the tab on which the press began
+    int m_pressedTab = -1; // the same, while the finger is on it
     OneFinger m_finger{this};
 };

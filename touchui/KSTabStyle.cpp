@@ -19,7 +19,7 @@ const char STANDARD_IMAGES[] = "Pane_Tab:Tab_Rest_Left:Tab_Rest_Center:Tab_Rest_
                                "Tab_Disabled_Left:Tab_Disabled_Center:Tab_Disabled_Right:"
                                "Tab_Selected_Left:Tab_Selected_Center:Tab_Selected_Right";
 
-// The pictures show a tab over its pane; for the other sides they are turned or mirrored.
+// The pictures show a tab above its pane; for the other sides they are rotated or mirrored.
 void turn(QPainter& painter, QTabBar::Shape shape, QRect& rect)
 {
     switch (shape) {
@@ -158,7 +158,7 @@ void KSTabStyle::drawTabBarLabel(const QStyleOptionTab& option, QPainter& painte
     painter.restore();
 }
 
-// Takes the icon's room from the area.
+// Draws the icon and removes its space from the area.
 void KSTabStyle::drawTabBarPixmap(const QStyleOptionTab& option, QPainter& painter, QRect& area) const
 {
     if (option.icon.isNull()) {

@@ -9,19 +9,19 @@
 class QStyleOptionTab;
 
 // Paints the tabs of a KSTabBar from pictures. The image string is "<folder>:<left>:<centre>:<right>:..."
-// with three names for each look in the order of Look; a name stands for ":/<folder>/<name>". The looks that
-// the string leaves out are painted like those at rest.
+// with three names for each look in the order of Look; a name stands for ":/<folder>/<name>". Looks that are
+// missing in the string are painted like Rest.
 class KSTabStyle : public KSCommonStyle
 {
     Q_OBJECT
 public:
     enum Look { Rest, Pressed, Disabled, Selected, LookCount };
 
-    // An empty string takes the standard pictures.
+    // An empty string selects the standard pictures.
     explicit KSTabStyle(const QString& images = QString());
     void setImages(const QString& images);
 
-    // The tab that a finger holds, -1 for none.
+    // Sets the tab that a finger holds; -1 for none.
     void setPressedTab(int index) { m_pressedTab = index; }
 
     void drawControl(ControlElement element, const QStyleOption* option, QPainter* painter,

@@ -31,7 +31,7 @@ KSTabWidget::KSTabWidget(QWidget* parent) : QTabWidget(parent), m_bar(new KSTabB
     look->setParent(this);
     setStyle(look);
     setTabBar(m_bar);
-    m_bar->setExpanding(false); // the base has just changed that
+    m_bar->setExpanding(false); // the base class has just reset this
     setPaneImages(QStringLiteral(":/Pane_Tab/Pane_"));
 }
 

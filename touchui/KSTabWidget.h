@@ -6,7 +6,7 @@
 
 class KSTabBar;
 
-// A tab widget with a KSTabBar, whose pane is painted from nine pictures.
+// A tab widget with a KSTabBar and a pane that is painted from nine pictures.
 class KSTabWidget : public QTabWidget
 {
     Q_OBJECT
@@ -14,17 +14,17 @@ public:
     explicit KSTabWidget(QWidget* parent = nullptr);
 
     KSTabBar* ksTabBar() const { return m_bar; }
-    // Hides that of the base: the bar takes the matching shape, too.
+    // Hides the function of the base class; also sets the matching shape of the bar.
     void setTabPosition(TabPosition position);
-    // The nine pictures of the pane: prefix + "Upper_Left" and so on.
+    // Sets the nine pictures of the pane: prefix + "Upper_Left" and so on.
     void setPaneImages(const QString& prefix);
 
 protected:
     void paintEvent(QPaintEvent* event) override;
-    // The widget without the bar's strip.
+    // Returns the widget's rectangle without the strip of the bar.
     QRect paneRect() const;
 
 private:
-    KSTabBar* m_bar; // child of this
+    KSTabBar* m_bar; // child of this object
     SliceFrame m_pane;
 };

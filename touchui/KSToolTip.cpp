@@ -39,7 +39,7 @@ KSToolTip* KSToolTip::getInstance()
 {
     if (s_KsToolTip == nullptr) {
         s_KsToolTip = new KSToolTip;
-        // Its window may not outlive the application.
+        // The window of the balloon must be destroyed before the application.
         connect(qApp, &QCoreApplication::aboutToQuit, s_KsToolTip, &KSToolTip::clearInstance);
     }
     return s_KsToolTip;

@@ -13,29 +13,30 @@ class BalloonWindow;
 class QPainter;
 class QWidget;
 
-// The one balloon with an arrow that tells the value of a slider or the whole text of a row. GUI thread only.
+// The only instance of the balloon with an arrow that shows the value of a slider or the whole text of a row.
+// GUI thread only.
 class KSToolTip : public QObject
 {
     Q_OBJECT
 public:
-    // Made at the first call.
+    // Created by the first call.
     static KSToolTip* getInstance();
     static void clearInstance();
 
-    // Shows the text by a rectangle in global coordinates, above it where there is room. An empty text hides
+    // Shows the text beside a rectangle in global coordinates, above it if there is room. An empty text hides
     // the balloon.
     static void showText(const QRect& anchor, const QString& text);
-    // The same by the slider's handle.
+    // Shows the text in the same way beside the slider's handle.
     static void showTextForSlider(const QRect& handle, const QString& text);
-    // The same under a row; nothing is shown for a text that the row shows whole.
+    // Shows the text below a row. Hides the balloon if the text fits into shownWidth pixels.
     static void showTextForTreeView(const QRect& row, const QString& text, int shownWidth = 0);
     static void hideText();
     static bool isVisible();
-    // The text as it was given, before it was shortened.
+    // Returns the full text, even if it is shown elided.
     static QString text() { return s_LongText; }
     static QFont textFont();
 
-    // Bounds the balloon and owns its window; null: the screen does.
+    // Limits the position of the balloon and is the parent of its window. If null, the screen is the limit.
     static QWidget* s_mainWindow;
 
 private:
@@ -44,7 +45,7 @@ private:
 
     void show(const QRect& anchor, const QString& text, bool below);
     QRect calculateTextRect(const QString& text) const;
-    // Cuts the end off, with an ellipsis, until the text is no wider.
+    // Elides the end of the text until it fits into the width in pixels.
     QString changeTextLength(const QString& text, int width) const;
     MenuPlacement::Placement adjustToolTipPostion(const QRect& anchor, const QSize& size, bool below);
     void paintTop(QPainter& painter, const QRect& rect, const QString& text) const;

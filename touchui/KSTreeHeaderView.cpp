@@ -17,14 +17,14 @@ KSTreeHeaderView::KSTreeHeaderView(KSTreeView* view) : QHeaderView(Qt::Horizonta
     setSectionsClickable(true);
     setHighlightSections(false);
     setSectionsMovable(false);
-    setSectionResizeMode(QHeaderView::Fixed); // a finger would drag borders by accident
+    setSectionResizeMode(QHeaderView::Fixed); // a finger would move borders by accident
     setStretchLastSection(true);
     setSortIndicatorShown(true);
     setSortIndicator(-1, Qt::AscendingOrder);
     setFocusPolicy(Qt::NoFocus);
     connect(&m_finger, &OneFinger::acted, this,
             [this](QEvent::Type type) { sendMouse(type, m_finger.position()); });
-    // Far outside: the section comes up unclicked.
+    // Release far outside, so that the section is not clicked.
     connect(&m_finger, &OneFinger::cancelled, this, [this] {
         sendMouse(QEvent::MouseButtonRelease, viewport()->mapToGlobal(QPointF(-10000, -10000)));
     });

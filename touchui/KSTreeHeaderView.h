@@ -8,7 +8,7 @@
 class KSTreeView;
 class QTouchEvent;
 
-// The header of a KSTreeView: one finger works it like a mouse, a tap on a section sorts.
+// The header of a KSTreeView, which a finger operates like a mouse: a tap on a section sorts by it.
 class KSTreeHeaderView : public QHeaderView
 {
     Q_OBJECT

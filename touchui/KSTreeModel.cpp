@@ -95,7 +95,7 @@ int KSTreeModel::createTreeItemChildren(KSModelItem* item)
     return item->childCount();
 }
 
-// Rows that were put in by hand have no source and so no children there.
+// Rows that were inserted by hand have no source, so they get no children here.
 std::vector<std::unique_ptr<KSModelItem>> KSTreeModel::makeChildren(KSModelItem* item)
 {
     std::vector<std::unique_ptr<KSModelItem>> children;
@@ -298,8 +298,8 @@ QModelIndex KSTreeModel::parent(const QModelIndex& child) const
 
 int KSTreeModel::rowCount(const QModelIndex& parent) const
 {
-    // The children come into being with the question about them, so nothing was ever told about their
-    // absence and no signal is due.
+    // Children are created when their number is first requested. No view has seen the row without children,
+    // so no signal is needed.
     return parent.column() > 0 ? 0
                                : const_cast<KSTreeModel*>(this)->createTreeItemChildren(itemOrRoot(parent));
 }
@@ -334,7 +334,7 @@ QVariant KSTreeModel::data(const QModelIndex& index, int role) const
         return own.isValid() ? own : getDefaultAttribute(which, index.column());
     };
     if (role == Qt::CheckStateRole && !value(KSVIEW::ItemCheckableRole).toBool()) {
-        return QVariant(); // any value would draw a box
+        return QVariant(); // no check box is drawn for an invalid value
     }
     const QVariant found = value(role);
     return role == Qt::EditRole && !found.isValid() ? value(Qt::DisplayRole) : found;
@@ -414,7 +414,8 @@ bool KSTreeModel::removeRows(int row, int count, const QModelIndex& parent)
         return false;
     }
     beginRemoveRows(parent, row, row + count - 1);
-    std::vector<std::unique_ptr<KSModelItem>> removed; // alive until nobody holds an index of them
+    // destroyed after endRemoveRows(), when no index refers to them
+    std::vector<std::unique_ptr<KSModelItem>> removed;
     for (int i = 0; i < count; ++i) {
         removed.push_back(item->remove(row));
     }
@@ -439,7 +440,7 @@ bool KSTreeModel::moveRows(const QModelIndex& sourceParent, int sourceRow, int c
     }
     int row = destinationChild;
     if (from == to && destinationChild > sourceRow) {
-        row -= count; // the gap closed before the destination
+        row -= count; // removing the rows has moved the destination
     }
     for (auto& item : taken) {
         to->addChild(std::move(item), row++);
@@ -513,7 +514,7 @@ bool KSTreeModel::removeColumns(int column, int count, const QModelIndex& parent
         return false;
     }
     if (column == 0) {
-        // The rows below hang on the first column, so nothing of theirs would outlive the signal.
+        // The rows below are children of the first column, so their indices do not survive. Reset the model.
         beginResetModel();
         changeColumns(column, count, 0);
         endResetModel();
@@ -525,8 +526,8 @@ bool KSTreeModel::removeColumns(int column, int count, const QModelIndex& parent
     return true;
 }
 
-// All rows share the columns, and the signal speaks of the top rows alone: the indices of the rows below are
-// moved here.
+// All rows have the same columns, but the signal concerns only the top rows, so the persistent indices of the
+// rows below are moved here.
 void KSTreeModel::changeColumns(int column, int removed, int inserted)
 {
     QModelIndexList before;
@@ -561,5 +562,5 @@ void KSTreeModel::changeColumns(int column, int removed, int inserted)
     }
     m_headerData = headers;
     m_columnCount += inserted - removed;
-    m_sortColumn = -1; // it may be another now
+    m_sortColumn = -1; // the sort column may have moved
 }

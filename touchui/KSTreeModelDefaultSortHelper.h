@@ -2,7 +2,8 @@
 
 #include "touchui/KSTreeModelSortHelper.h"
 
-// Sorts by name, date or size; equal items keep their order. Lists whose parent is no folder are left alone.
+// Sorts by name, date or size; the order of equal items is kept. Does not sort lists whose parent is not a
+// folder.
 class KSTreeModelDefaultSortHelper : public KSTreeModelSortHelper
 {
     Q_OBJECT

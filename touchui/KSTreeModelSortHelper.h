@@ -5,7 +5,7 @@
 
 class KSModelItem;
 
-// How a KSTreeModel sorts one child list.
+// The strategy by which a KSTreeModel sorts one child list.
 class KSTreeModelSortHelper : public QObject
 {
     Q_OBJECT
@@ -14,8 +14,8 @@ public:
 
     explicit KSTreeModelSortHelper(QObject* parent = nullptr);
 
-    // dataType: the KSModelDataFactory::KSDataType of the column; sortKind: one of the above. A pair that
-    // the helper does not know leaves the list as it is.
+    // dataType is the KSModelDataFactory::KSDataType of the column, sortKind one of the above. The list is
+    // not changed for unknown combinations.
     virtual void sortChildList(int dataType, int sortKind, QList<KSModelItem*>& list,
                                Qt::SortOrder order) = 0;
 };

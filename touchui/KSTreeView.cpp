@@ -17,7 +17,7 @@
 namespace
 {
 
-// As wide as a finger, and without arrows.
+// Wide enough for a finger, and without arrow buttons.
 const char SCROLL_BAR_STYLE[] =
     "QScrollBar { margin: 0px; border: 0px; background-color: rgb(51, 51, 51) }"
     "QScrollBar:vertical { width: 32px } QScrollBar:horizontal { height: 32px }"
@@ -69,7 +69,7 @@ KSTreeView::KSTreeView(QWidget* parent)
 
 KSTreeView::~KSTreeView()
 {
-    setStyle(nullptr); // ours goes before the widget does
+    setStyle(nullptr); // this view's style is destroyed before the base class
 }
 
 void KSTreeView::initScrollBars()
@@ -164,7 +164,7 @@ bool KSTreeView::moveToSibling(QModelIndex sibling)
     }
     const int behind = sibling.row() + 1;
     if (behind == current.row() || behind == current.row() + 1) {
-        return true; // it is there, or it is the sibling itself
+        return true; // it is there already, or it is the sibling itself
     }
     return model()->moveRow(current.parent(), current.row(), sibling.parent(), behind);
 }
@@ -368,7 +368,7 @@ void KSTreeView::closeEditorState(QWidget* editor, QAbstractItemDelegate::EndEdi
     closeEditor(editor, hint);
 }
 
-// The base would make the first row current, which nobody has chosen.
+// Skips the base class, which would make the first row current.
 void KSTreeView::focusInEvent(QFocusEvent* event)
 {
     QAbstractScrollArea::focusInEvent(event);
@@ -570,7 +570,7 @@ void KSTreeView::onTranslateTouchEndEventToMouse(QTouchEvent*)
     sendMouse(QEvent::MouseButtonRelease, fingerPosition());
 }
 
-// Nothing was tapped, and nothing goes on moving.
+// Ends the press without a tap and stops any motion.
 void KSTreeView::rest()
 {
     m_flicker.cancel();
@@ -592,7 +592,7 @@ void KSTreeView::sendMouse(QEvent::Type type, const QPoint& point)
     m_sendingMouse = false;
 }
 
-// --- Mouse, and what a touch is passed on as ----------------------------------------------------------
+// --- Mouse, including touches that are passed on as mouse events --------------------------------------
 
 void KSTreeView::mousePressEvent(QMouseEvent* event)
 {
@@ -690,8 +690,7 @@ void KSTreeView::cancelPress()
     viewport()->update();
 }
 
-// What was pressed counts, also when the list has moved a few pixels under the finger. Receivers may change
-// the model.
+// Uses what was pressed, even if the list has moved by a few pixels since. Receivers may change the model.
 void KSTreeView::tap(const QPoint& point)
 {
     const QPersistentModelIndex index = m_pressIndex;

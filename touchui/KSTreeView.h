@@ -20,13 +20,13 @@ class KSTreeHeaderView;
 class KSTreeModel;
 class QTouchEvent;
 
-// A tree for one finger: a drag scrolls, a quick one lets the list glide on, a tap selects a row, opens or
-// closes it, or works its check box, and a hold of 700 ms asks for the row's name to be edited. A finger that
-// lands on a gliding list stops it and presses nothing. The mouse does the same.
+// A tree that is operated with one finger: a drag scrolls, a flick lets the list glide, a tap selects a row,
+// expands or collapses it, or toggles its check box, and a hold of 700 ms requests that the row's name is
+// edited. A touch on a gliding list only stops it. The mouse works in the same way.
 //
-// pressed() and clicked() come when a tap ends on an enabled row, which is then current; pressed() also with
-// a hold. Positions are in viewport coordinates. Works on a KSTreeModel; of other models only what QTreeView
-// knows is shown. GUI thread only.
+// A tap on an enabled row makes it current and emits pressed() and clicked(); a hold emits only pressed().
+// Positions are in viewport coordinates. Intended for a KSTreeModel; of other models only the standard roles
+// are shown. GUI thread only.
 class KSTreeView : public QTreeView
 {
     Q_OBJECT
@@ -43,49 +43,49 @@ public:
         PartialDisabled
     };
 
-    // In the order of CheckBoxImage.
+    // Paths of the pictures in the order of CheckBoxImage.
     static QStringList s_checkBoxImagesPath;
 
     explicit KSTreeView(QWidget* parent = nullptr);
     ~KSTreeView() override;
 
     void setModel(QAbstractItemModel* model) override;
-    // Null when the model is of another class.
+    // Returns null if the model is of another class.
     KSTreeModel* treeModel() const { return m_treeModel; }
     KSViewStyle* viewStyle() const { return m_viewStyle.get(); }
     CustomTreeDelegete* treeDelegate() const { return m_delegate; }
 
-    // The value set, else the default.
+    // Returns the value that was set, or the default.
     QVariant getDesignAttribute(KSVIEW::enumDesignAttributeRole role) const;
     void setDesignAttribute(KSVIEW::enumDesignAttributeRole role, const QVariant& value);
     int rowHeightOf(const QModelIndex& index) const;
     QColor headerTextColor(int section) const;
 
-    // Into the model; false when it refuses.
+    // Inserts rows into the model; returns false if it refuses.
     virtual bool insertRows(int row, int count, const QModelIndex& parent);
     virtual QRect getCheckBoxRect(const QModelIndex& index) const;
     virtual QRect getIndicatorRect(const QModelIndex& index) const;
     virtual CheckBoxImage getCheckBoxImageType(const QModelIndex& index) const;
-    // step counts from 1 to 8; others are taken round.
+    // step counts from 1 to 8; other values wrap around.
     virtual QString getLoadingImagePath(int step) const;
-    // Toggles a checkable and enabled cell, with all below and above it.
+    // Toggles a cell that is checkable and enabled, and updates the rows below and above it.
     virtual void changeCheckState(const QModelIndex& index);
     virtual void changeParentsCheckState(const QModelIndex& index);
     // See TreeCheckStates.
     virtual void changeCheckStateByNumber(const QModelIndex& index, int number);
     virtual void changeChildrenCheckState(const QModelIndex& index, Qt::CheckState state);
-    // Moves the current row right behind a row of the same parent; false when that cannot be.
+    // Moves the current row directly behind a row of the same parent; returns false if that is not possible.
     virtual bool moveToSibling(QModelIndex sibling);
     virtual bool isTextElide(const QModelIndex& index) const;
     virtual bool isIndicatorPressed(const QModelIndex& index) const;
     virtual void drawOnEmptyArea(QPainter* painter);
     virtual void drawEmptyRow(QPainter* painter, const QRect& rect);
-    // Below the last row; empty when the rows fill the view.
+    // Returns the area below the last row; empty if the rows fill the view.
     virtual QRect getEmptyArea() const;
-    // cell is the first column's, without its indentation.
+    // cell is the cell in the first column without its indentation.
     virtual KSViewStyle::FirstColumnLayout getLayoutForFirstColumn(const QRect& cell,
                                                                    const QModelIndex& index) const;
-    // The whole row, over the full width.
+    // Returns the rectangle of the row over the full width.
     virtual QRect getIndexVisualRect(const QModelIndex& index) const;
     virtual QVariant getDefaultDesignAttribute(KSVIEW::enumDesignAttributeRole role) const;
 
@@ -102,16 +102,17 @@ public:
     virtual bool hasFlicked() { return m_flicker.hasFlicked(); }
     virtual void stopFlick() { m_flicker.stop(); }
     virtual bool isAutoFilck() { return m_flicker.isGliding(); }
-    // By how much the content moves at this tick; moves the start point.
+    // Returns the distance by which the content moves in this tick, and advances the start point.
     virtual QPoint getDistance();
     virtual QPoint getFlickDistance() { return FlickMotion::pixels(m_flicker.glide()); }
     virtual QPoint getDragDistance() { return FlickMotion::pixels(m_flicker.drag()); }
-    // Scrolls the content down by the offset, within the range.
+    // Scrolls the content down by offset pixels, within the range.
     virtual void changeScrollBarValue(int offset);
-    // The target of a finger around a check box.
+    // Returns the touch area around a check box.
     virtual QRect getCheckBoxRectForTouch(const QModelIndex& index) const;
 
-    // Ends an edit; the text is committed except with RevertModelCache. Null and strangers are ignored.
+    // Ends an edit; the text is committed except with RevertModelCache. Null and editors of other views are
+    // ignored.
     void closeEditorState(QWidget* editor, QAbstractItemDelegate::EndEditHint hint);
     // The cell whose editor is open.
     QModelIndex getRenameIndex() const { return m_renameIndex; }
@@ -119,7 +120,7 @@ public:
     void setCheckBoxVisible(bool visible);
     void clearAllLoadingState();
     void clearRecording();
-    // Starts the timers that run once more from the beginning.
+    // Restarts the timers that are running.
     void allTimersReset();
     void setHoldInterval(int milliseconds) { m_holdInterval = milliseconds; }
 
@@ -127,11 +128,11 @@ public:
     void keyboardSearch(const QString&) override {} // would change the selection
 
 Q_SIGNALS:
-    // Opens the editor of the cell.
+    // Requests the editor of the cell.
     void editorEvent(QModelIndex index);
-    // A tap made the row current.
+    // Emitted when a tap has made the row current.
     void signalCurrentChangedByTouch(QModelIndex index);
-    // A row was held; it is current.
+    // Emitted when a row was held; it is the current row.
     void signalPressedAndHold(QModelIndex index);
 
 public Q_SLOTS:

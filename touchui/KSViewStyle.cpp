@@ -156,7 +156,7 @@ void KSViewStyle::drawHeaderArrow(QPainter* painter, const QStyleOptionHeader& o
     if (option.sortIndicator == QStyleOptionHeader::None) {
         return;
     }
-    // Qt's "down" is the ascending order, whose sign points up here.
+    // Qt's "down" is the ascending order, for which the arrow points up here.
     const bool ascending = option.sortIndicator == QStyleOptionHeader::SortDown;
     QRect rect = option.rect;
     rect.setLeft(rect.right() + 1 - HEADER_ARROW_SIZE - length(KSVIEW::DesignItemSpacing));

@@ -5,12 +5,12 @@
 
 class QWidget;
 
-// Knows whether the field with the input focus is handling the release of a key. GUI thread only.
+// Tracks whether the field with the input focus is handling the release of a key. GUI thread only.
 class KeyReleaseWatch : public QObject
 {
     Q_OBJECT
 public:
-    // Watches this widget instead of the last one; null watches nothing.
+    // Watches this widget instead of the previous one; null stops watching.
     void watch(QWidget* widget);
     bool isReleasing() const { return m_releasing; }
 

@@ -12,7 +12,7 @@ namespace
 {
 
 constexpr int FIELD_KIND = 1;
-constexpr int UNLIMITED_LENGTH = 32767; // what QLineEdit starts with
+constexpr int UNLIMITED_LENGTH = 32767; // the default of QLineEdit
 
 QString patternOf(const QLineEdit& edit)
 {

@@ -4,13 +4,13 @@
 
 class QLineEdit;
 
-// A line edit, which takes its text with Enter.
+// A line edit, whose text is entered with Enter.
 class LineEditField : public InputField
 {
 public:
     explicit LineEditField(QLineEdit& edit) : m_edit(edit) {}
 
-    // The object name, and what the line edit says of itself.
+    // Combines the object name with the properties of the line edit.
     SubCommonDefine::tagSoftKeyBoardInitData describe() const override;
     bool keepsKeyboard() const override { return false; }
     // Replaces the content.

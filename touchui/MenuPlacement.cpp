@@ -7,10 +7,10 @@ namespace MenuPlacement
 namespace
 {
 
-constexpr int ABOVE_OVERLAP = 45;      // how far a menu beside its anchor reaches below it
-constexpr int LEAST_BOTTOM_SPACE = 11; // with less, that menu keeps BOTTOM_SPACE
+constexpr int ABOVE_OVERLAP = 45;      // how far a menu beside its anchor extends below it
+constexpr int LEAST_BOTTOM_SPACE = 11; // if less is left below that menu, it keeps BOTTOM_SPACE
 constexpr int BOTTOM_SPACE = 13;
-constexpr int GAP = 9; // between a menu and the anchor under it
+constexpr int GAP = 9; // between a menu and the anchor below it
 
 int rightEdge(const QRect& rect)
 {
@@ -22,13 +22,13 @@ int bottomEdge(const QRect& rect)
     return rect.y() + rect.height();
 }
 
-// What is too large for its bounds starts at their beginning.
+// Returns the start that keeps the length inside the bounds; if it is too long, the beginning of the bounds.
 int keepInside(int start, int length, int from, int to)
 {
     return std::max(std::min(start, to - length), from);
 }
 
-// Where the arrow's tip is along its side.
+// Returns the position of the arrow's tip along its side.
 int tipAlong(int anchor, int start, int length)
 {
     const int inset = std::min(ARROW_INSET + ARROW_WIDTH / 2, length / 2);

@@ -4,48 +4,49 @@
 #include <QRect>
 #include <QSize>
 
-// Where a menu or a balloon goes beside what it belongs to, and where its arrow sits: pure functions.
-// Anchors, bounds and results are in one coordinate space, the caller's; edges are half open, so a
-// rectangle's lower edge is y + height.
+// Calculates the positions of menus and balloons beside their anchors, and of their arrows: pure functions.
+// Anchors, bounds and results are in one coordinate space, which the caller chooses. Edges are half open: a
+// rectangle's bottom edge is y + height.
 namespace MenuPlacement
 {
 
-// How a menu stands to its anchor. With neither Below nor Above it stands over the anchor, arrow down.
+// Placement of a menu relative to its anchor. With neither Below nor Above it is above the anchor with the
+// arrow down.
 enum Flag {
-    Below = 1,       // its top under the anchor
-    Above = 4,       // beside the anchor, most of it over it
-    Horizontal = 32, // it starts at the anchor instead of being centred on it
+    Below = 1,       // its top is at the anchor
+    Above = 4,       // beside the anchor, mostly higher than it
+    Horizontal = 32, // begins at the anchor instead of being centred on it
 };
 
 enum class ArrowSide { Top, Bottom, Left, Right };
 
-// The room that a menu leaves for its arrow on the arrow's side.
+// The space in pixels that a menu leaves for its arrow on the arrow's side.
 constexpr int ARROW_LENGTH = 12;
 constexpr int ARROW_WIDTH = 24;
-// An arrow keeps this far away from the corners.
+// Least distance of an arrow from the corners, in pixels.
 constexpr int ARROW_INSET = 14;
 
 struct Placement {
-    QRect rect; // arrow included
+    QRect rect; // including the arrow
     ArrowSide side = ArrowSide::Top;
     QPoint tip; // of the arrow, relative to rect
 };
 
-// The menu's upper edge.
+// Returns the top edge of a menu, within the bounds.
 int menuTop(int flags, int anchorY, int menuHeight, const QRect& bounds);
-// The menu's left edge, within the bounds.
+// Returns the left edge of a menu, within the bounds.
 int menuLeft(int flags, int anchorX, int menuWidth, const QRect& bounds);
 Placement placeMenu(int flags, const QPoint& anchor, const QSize& size, const QRect& bounds);
-// A balloon over the anchor with the arrow down, or under it where there is no room above (or below is
-// asked for and has room).
+// Places a balloon above the anchor with the arrow down, or below it if there is no room above, or if below
+// is requested and has room.
 Placement placeBalloon(const QRect& anchor, const QSize& size, const QRect& bounds, bool below = false);
 
-// What is left of a menu or balloon of the size without its arrow.
+// Returns the rectangle of a menu or balloon of this size without its arrow.
 QRect background(const QSize& size, ArrowSide side);
-// Row number index of count rows of equal height between the border lines of the background. The last row
-// takes what does not divide.
+// Returns the rectangle of one of count rows of equal height inside the border of the background. The last
+// row includes the remainder of the division.
 QRect rowRect(const QRect& background, int border, int count, int index);
-// The row at the point; -1 outside all.
+// Returns the row at the point, or -1.
 int rowAt(const QRect& background, int border, int count, const QPoint& point);
 
 } // namespace MenuPlacement

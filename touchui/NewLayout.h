@@ -1,7 +1,7 @@
 #pragma once
 
-// Returns a new layout, such as QHBoxLayout, without margins. The caller gives it to a widget or to another
-// layout, which owns it.
+// Returns a new layout, such as QHBoxLayout, without margins. The caller must add it to a widget or to
+// another layout, which then owns it.
 template <typename Layout>
 Layout* newLayout(int spacing = 0)
 {

@@ -28,7 +28,7 @@ OneFinger::Step OneFinger::follow(const QTouchEvent* event, QObject* receiver)
     return step;
 }
 
-// A receiver may destroy the widget, and with it this object.
+// Guards against a receiver that destroys the widget, and with it this object.
 void OneFinger::report(Step step)
 {
     const QPointer<OneFinger> self = this;
@@ -101,7 +101,7 @@ OneFinger::Step OneFinger::stepOf(const QTouchEvent* event, QObject* receiver)
             continue;
         }
         m_position = point.globalPosition();
-        // With another finger on the same object, the lift is an update of the event.
+        // If another finger is still on the same object, the lift is reported by a TouchUpdate.
         if (event->type() == QEvent::TouchUpdate && point.state() != QEventPoint::State::Released) {
             return Step::Move;
         }
@@ -109,7 +109,7 @@ OneFinger::Step OneFinger::stepOf(const QTouchEvent* event, QObject* receiver)
         return Step::End;
     }
     if (event->type() == QEvent::TouchEnd) {
-        drop(); // all fingers are up, and this one's lift was lost
+        drop(); // all fingers are up, but the lift of this one was not reported
     }
     return Step::None;
 }
@@ -137,9 +137,9 @@ OneFinger::Step OneFinger::begin(const QTouchEvent* event, QObject* receiver)
     return Step::Begin;
 }
 
-// Whether the finger that is followed cannot be down any more when a touch begins at the object. A second
-// finger on the same object would have joined the touch; on another object it is one too many, as long as the
-// first one's object has its touch.
+// Returns whether the current finger must be up already when a touch begins at receiver. A second finger on
+// the same object would have been part of the same touch. On another object it is an additional finger as
+// long as the first object still has its touch.
 bool OneFinger::isLost(const QObject* receiver) const
 {
     if (receiver == m_receiver) {
@@ -153,7 +153,7 @@ void OneFinger::cancel()
 {
     if (isDown()) {
         const QPointer<OneFinger> self = this;
-        cancelTouchOf(m_receiver); // comes by as a cancelled touch, unless somebody keeps it
+        cancelTouchOf(m_receiver); // normally arrives here as a TouchCancel, unless it is filtered
         if (self == nullptr || !isDown()) {
             return;
         }
@@ -196,7 +196,7 @@ void OneFinger::drop()
     Q_EMIT cancelled();
 }
 
-// What is left of the receiver is not fit to be put back by the widget.
+// Reports the end later, when the receiver is destroyed completely and the widget does not use it any more.
 void OneFinger::receiverDestroyed(QObject* receiver)
 {
     if (isDown() && (m_receiver == nullptr || m_receiver == receiver)) {

@@ -12,74 +12,75 @@ class QEventPoint;
 class QTouchEvent;
 class QWidget;
 
-// Tracks the one finger that works a widget: which touch point it is, where it is, and whether it is held
-// still long enough. Further fingers are ignored until it is lifted.
+// Tracks the one finger that operates a widget: its touch point, its position, and whether it is held still
+// long enough. Further fingers are ignored until it is lifted.
 //
-// A touch that does not end by a lift is cancelled here, for every widget in the same way: when a
+// A touch that does not end with a lift is cancelled here in the same way for every widget: when a
 // QEvent::TouchCancel arrives, when the widget is hidden or disabled, when the object that received the touch
-// is destroyed, and when a touch begins although the last one had no end. cancelled() is then emitted, and
-// its receiver brings the widget back to rest: it stops its timers and puts what it carried where it was.
+// is destroyed, and when a new touch begins although the last one has not ended. The receiver of cancelled()
+// then resets the widget: it stops timers and returns a dragged item to its position.
 //
-// Positions are global unless said otherwise. GUI thread only.
+// Positions are global unless stated otherwise. GUI thread only.
 class OneFinger : public QObject
 {
     Q_OBJECT
 public:
-    // What an event means for the finger. None: it concerns another finger, or the touch was cancelled.
+    // The meaning of an event for the finger. None: the event is for another finger, or the touch was
+    // cancelled.
     enum class Step { None, Begin, Move, End };
 
-    // The widget is not owned and must outlive this object, of which it is usually the owner.
+    // The widget, which is usually the owner of this object, must outlive it.
     explicit OneFinger(QWidget* widget);
 
-    // Takes a touch event. receiver is the object that the event was sent to, where the event does not say it
-    // itself: the widget, or a child whose touches the widget takes.
+    // Handles a touch event. receiver is the object to which the event was sent, if the event does not
+    // contain it: the widget, or a child whose touches the widget handles.
     Step follow(const QTouchEvent* event, QObject* receiver = nullptr);
-    // Takes an event that is of touch, see follow(). Returns whether it is.
+    // Handles the event with follow() if it is a touch event; returns whether it is.
     bool takes(QEvent* event, QObject* receiver = nullptr);
     static bool isTouch(const QEvent* event);
-    // What the last event meant.
+    // Returns the meaning of the last event.
     Step step() const { return m_step; }
-    // Cancels the touch at its receiver, whose part of the touch lock becomes free, and the hold. Does
-    // nothing when there is neither.
+    // Cancels the touch at its receiver, which releases its touch lock, and stops the hold. Does nothing if
+    // there is neither.
     void cancel();
 
     bool isDown() const { return m_id != NONE; }
-    // Of the touch point; -1 when no finger is down.
+    // The id of the touch point; -1 if no finger is down.
     int id() const { return m_id; }
-    // The object that received the touch; null when no finger is down.
+    // The object that received the touch; null if no finger is down.
     QObject* receiver() const { return m_receiver; }
-    // Where the finger is, or was lifted.
+    // The position of the finger, or of the lift.
     QPointF position() const { return m_position; }
     QPointF pressPosition() const { return m_pressPosition; }
-    // The same in coordinates of the widget.
+    // Returns position() in coordinates of the widget.
     QPointF positionIn(const QWidget* widget) const;
 
-    // Emits held() after so many milliseconds, unless the finger is lifted or cancelled, or stopHold() is
-    // called. Starts anew when it runs already.
+    // Emits held() after this time in milliseconds, unless the finger is lifted or cancelled or stopHold() is
+    // called before. Restarts the time if it is running.
     void startHold(int milliseconds);
     void stopHold() { m_hold.stop(); }
-    // Starts the time once more, if it runs.
+    // Restarts the time if it is running.
     void restartHold() { m_hold.restartIfActive(); }
 
-    // Cancels the touch of an object, for those who keep the rest of a touch from it: sends it a
-    // QEvent::TouchCancel by way of the application. Harmless when the object has no touch.
+    // Cancels the touch of an object by sending it a QEvent::TouchCancel. For callers that keep the further
+    // events of the touch from the object. Has no effect if the object has no touch.
     static void cancelTouchOf(QObject* object);
 
     bool eventFilter(QObject* object, QEvent* event) override;
 
-    // The mouse event that a touch is passed on as: the finger is the left button. position is in the
-    // widget.
+    // Returns the mouse event for a touch, with the finger as the left button. position is in widget
+    // coordinates.
     static QMouseEvent mouseEvent(QEvent::Type type, const QPointF& position, const QPointF& globalPosition);
 
 Q_SIGNALS:
-    // The finger came down, moved, was lifted; by then isDown() is false.
+    // Emitted when the finger comes down, moves and is lifted. isDown() is false at the lift.
     void began();
     void moved();
     void lifted();
-    // The same, as the type of the mouse event that says so.
+    // Emitted for the same steps with the type of the corresponding mouse event.
     void acted(QEvent::Type mouse);
-    // The touch ended without a lift; isDown() is false already. When the object that received the touch is
-    // destroyed, this comes once it is gone.
+    // Emitted when the touch ends without a lift; isDown() is already false. If the object that received the
+    // touch is destroyed, this is emitted after its destruction.
     void cancelled();
     void held();
 

@@ -38,7 +38,7 @@ void OutsidePressFilter::stop()
     if (m_swallowsTouch || m_swallowsMouse) {
         return;
     }
-    QCoreApplication::instance()->removeEventFilter(this); // where it stands when there is no gate
+    QCoreApplication::instance()->removeEventFilter(this); // installed only if there is no KSAppEventFilter
 }
 
 bool OutsidePressFilter::eventFilter(QObject* obj, QEvent* event)
@@ -73,7 +73,7 @@ bool OutsidePressFilter::eventFilter(QObject* obj, QEvent* event)
 bool OutsidePressFilter::swallowPress(QObject* obj, QEvent* event)
 {
     if (m_swallowsTouch || m_swallowsMouse) {
-        endSwallowing(); // whatever was swallowed has been lifted unseen
+        endSwallowing(); // the lift of the previous press was not seen
     }
     if (!m_watching || !isOutside(event)) {
         return false;
@@ -82,7 +82,7 @@ bool OutsidePressFilter::swallowPress(QObject* obj, QEvent* event)
     m_swallowsTouch = touch;
     m_swallowsMouse = !touch;
     m_swallowed = obj;
-    event->accept(); // or its end would not come
+    event->accept(); // otherwise its end would not be delivered
     Q_EMIT pressedOutside();
     return true;
 }

@@ -7,22 +7,23 @@ class KSAppEventFilter;
 class QEvent;
 class QWidget;
 
-// Closes what is open for the moment: tells of the first press or touch of this process outside a window, and
-// swallows that press and all that follows from it up to the lift, so that it presses nothing else. It stands
-// behind the application's gate for touches: a touch that the gate refuses, such as a second finger's, closes
-// nothing, and one that it lets through holds its lock up to the lift.
+// Closes temporary windows: reports the first press or touch of this process outside a window, and swallows
+// that press up to its lift, so that it has no other effect. It runs after the application's
+// KSAppEventFilter: a touch that the filter refuses, such as that of a second finger, closes nothing, and one
+// that it accepts holds its lock until the lift.
 //
-// Such windows are of the type Qt::ToolTip and not Qt::Popup: while a popup is open, Qt delivers no touches,
-// and the finger that opened it would never be lifted for the widget under it.
+// Such windows have the type Qt::ToolTip instead of Qt::Popup: while a popup is open, Qt delivers no touches,
+// and the widget under the finger that opened it would never receive the lift.
 class OutsidePressFilter : public QObject
 {
     Q_OBJECT
 public:
-    // window is not owned and may go first. Registers with the application's gate, so that it is asked before
-    // those that are made later. GUI thread only.
+    // window is not owned and may be destroyed first. Registers with the KSAppEventFilter, so that this
+    // filter is called before those that are created later. GUI thread only.
     explicit OutsidePressFilter(QWidget* window, QObject* parent = nullptr);
 
-    // Between these the presses are watched. A press that is being swallowed is swallowed to its end.
+    // Presses are watched between start() and stop(). A press that is being swallowed is swallowed up to its
+    // lift even after stop().
     void start();
     void stop();
     bool isWatching() const { return m_watching; }
@@ -40,8 +41,8 @@ private:
 
     QPointer<QWidget> m_window;
     bool m_watching = false;
-    QPointer<KSAppEventFilter> m_gate; // where it is registered, if there is one
+    QPointer<KSAppEventFilter> m_gate; // the filter with which this object is registered, if any
     bool m_swallowsTouch = false;
     bool m_swallowsMouse = false;
-    QPointer<QObject> m_swallowed; // the object that the press is kept from
+    QPointer<QObject> m_swallowed; // the object that does not receive the press
 };

@@ -17,7 +17,7 @@ namespace
 constexpr int SPACING = 4;
 constexpr int SEPARATOR_HEIGHT = 4;
 
-// The height that the layout gives the item.
+// Returns the height that the layout assigns to the item.
 int heightOf(const QWidget* item)
 {
     if (item->minimumHeight() == item->maximumHeight())
@@ -168,7 +168,7 @@ void ScrollViewerBoard::setMargins(const QMargins& margins)
     m_margins = margins;
 }
 
-// An item that is narrower than the board stands in its middle.
+// An item that is narrower than the board is centred.
 QRect ScrollViewerBoard::placeOf(const Row& row, int top) const
 {
     const int width = m_board->width() - m_margins.left() - m_margins.right();
@@ -239,7 +239,7 @@ void ScrollViewerBoard::hidePlaceholder()
     m_placeholder->hide();
 }
 
-// The first row whose lower edge is not above y.
+// Returns the first row that ends at or below y.
 std::vector<ScrollViewerBoard::Row>::const_iterator ScrollViewerBoard::firstEndingAt(int y) const
 {
     return std::partition_point(m_rows.begin(), m_rows.end(),

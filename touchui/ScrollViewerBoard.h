@@ -18,14 +18,14 @@ class QLabel;
 class QPainter;
 class QWidget;
 
-// The rows of a scroll viewer in their order, laid out from top to bottom on one board, with a placeholder
-// that keeps the place of an item that has been lifted. A row is added with its widget, or as a
-// ScrollViewerRow whose widget is made later. Coordinates are the board's unless said otherwise.
+// The rows of a scroll viewer, laid out from top to bottom on a board, with a placeholder at the position of
+// a lifted item. A row is added with its widget, or as a ScrollViewerRow whose widget is created later. Board
+// coordinates unless stated otherwise.
 class ScrollViewerBoard : public QObject
 {
     Q_OBJECT
 public:
-    // Makes the panel, which the viewer scrolls, and in it the board.
+    // Creates the panel, which the viewer scrolls, and the board inside it.
     explicit ScrollViewerBoard(QObject* parent);
     ~ScrollViewerBoard() override;
 
@@ -34,27 +34,27 @@ public:
 
     int count() const { return static_cast<int>(m_rows.size()); }
     bool isEmpty() const { return m_rows.empty(); }
-    // Makes the widget when there is none yet. Null when there is no such row.
+    // Creates the widget if necessary. Returns null if there is no such row.
     KSBaseItemWidget* at(int index);
-    // Null when there is no such row or its widget is not made.
+    // Returns null if there is no such row or its widget was not created.
     KSBaseItemWidget* made(int index) const;
-    // What the widget is made from; null for a row that was added with its widget.
+    // Returns the object that creates the widget; null for a row that was added with its widget.
     ScrollViewerRow* row(int index) const;
-    // Where the row lies since the last layout. There must be such a row.
+    // Returns the rectangle of the row in the last layout. The row must exist.
     QRect place(int index) const { return m_rows[static_cast<std::size_t>(index)].place; }
-    // The widgets that are made, from top to bottom.
+    // Returns the existing widgets from top to bottom.
     QList<KSBaseItemWidget*> widgets() const;
-    // -1 for null and for strangers.
+    // Returns -1 for null and for items that are not on the board.
     int indexOf(const KSBaseItemWidget* item) const;
-    // An index of -1 or beyond the end appends. Nothing is laid out before relayout().
+    // An index of -1 or beyond the end appends. The layout changes only with relayout().
     void insert(KSBaseItemWidget* item, int index);
     void insert(std::vector<std::unique_ptr<ScrollViewerRow>> rows, int index);
-    // Takes rows out of the order and the layout and returns those of their widgets that are made; they stay
-    // the board's children.
+    // Remove rows from the order and the layout. The second form returns their existing widgets, which remain
+    // children of the board.
     void take(KSBaseItemWidget* item);
     QList<KSBaseItemWidget*> take(int first, int count);
-    // Takes the widget of a row away, which makes another one when it needs one. The row must have been added
-    // without its widget.
+    // Removes the widget of a row, which creates another one when it is needed. The row must have been added
+    // without a widget.
     void giveBack(KSBaseItemWidget* item);
     void swap(int first, int second);
 
@@ -62,9 +62,9 @@ public:
     void setSpacing(int spacing);
     void setMargins(const QMargins& margins);
 
-    // Lays all rows out in their order, and gives board and panel their height.
+    // Lays out all rows in their order and sets the heights of board and panel.
     void relayout();
-    // Margins, rows, the place that is kept, and the gaps between them, as of the last layout.
+    // Returns the height of the last layout: margins, rows, placeholder and the gaps between them.
     int contentsHeight() const { return m_contentsHeight; }
     void setWidths(int panelWidth, int boardWidth);
 
@@ -72,7 +72,7 @@ public:
     void movePlaceholder(int index);
     void hidePlaceholder();
 
-    // Rows that a rectangle meets: they follow one another. count is 0 when there are none.
+    // The rows that intersect a rectangle, which are consecutive. count is 0 if there are none.
     struct Range {
         int first = -1;
         int count = 0;
@@ -80,16 +80,16 @@ public:
     };
     Range itemsMeeting(const QRect& rect) const;
     KSBaseItemWidget* itemInThePos(const QPoint& pos);
-    // The gap below an item belongs to it. What the visible rectangle shows above its first item belongs to
-    // that, and below its last one to that unless the list ends there.
+    // Returns the visible item at pos, including the gap below it. The area above the first visible item
+    // belongs to that item; the area below the last visible item belongs to that unless the list ends there.
     KSBaseItemWidget* itemAroundThePos(const QPoint& pos, const QRect& visible);
 
     void paintSeparators(QPainter& painter, const QRect& exposed) const;
 
 Q_SIGNALS:
-    // The widget of a row has been made and has its place; it does not show yet.
+    // Emitted when the widget of a row was created and placed, before it is shown.
     void itemMade(KSBaseItemWidget* item);
-    // An item was deleted without having been taken out.
+    // Emitted when an item was deleted without having been removed.
     void itemDestroyed(QObject* item);
 
 private:
@@ -113,7 +113,7 @@ private:
     std::vector<Row> m_rows;
     QMargins m_margins;
     int m_spacing;
-    int m_keptIndex = -1; // of the row before which the placeholder lies; -1: it does not show
+    int m_keptIndex = -1; // index of the row below the placeholder; -1 if it is hidden
     int m_contentsHeight = 0;
     int m_panelWidth = 0;
 };

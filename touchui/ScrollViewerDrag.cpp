@@ -10,7 +10,7 @@
 namespace
 {
 
-// The clone jumps aside from under the finger, so that it can be seen.
+// Moves the clone aside, so that the finger does not cover it.
 QPoint getDragItemOffset(DragFlagAlignment alignment)
 {
     return alignment == DRAGFLAG_LEFT ? QPoint(-20, 20) : QPoint(20, 20);
@@ -24,7 +24,7 @@ ScrollViewerDrag::ScrollViewerDrag(ScrollViewerBoard& board) : m_board(board)
 {
 }
 
-// Clones float over another window.
+// Deletes the clones here, because their parent is another window.
 ScrollViewerDrag::~ScrollViewerDrag()
 {
     abandon();

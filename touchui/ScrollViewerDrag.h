@@ -11,12 +11,12 @@
 
 class ScrollViewerBoard;
 
-// An item that has been lifted out of a scroll viewer: the clone that floats under the finger, the place that
-// is kept for it in the list, and the scrolling at the list's edges.
+// The drag of an item that was lifted out of a scroll viewer: the clone under the finger, the placeholder in
+// the list, and the scrolling at the edges of the list.
 class ScrollViewerDrag
 {
 public:
-    static constexpr int SCROLL_TIME = 40; // ms between two steps at an edge
+    static constexpr int SCROLL_TIME = 40; // ms between two scroll steps at an edge
 
     explicit ScrollViewerDrag(ScrollViewerBoard& board);
     ~ScrollViewerDrag();
@@ -24,34 +24,34 @@ public:
     ScrollViewerDrag& operator=(const ScrollViewerDrag&) = delete;
 
     bool isActive() const { return m_active; }
-    // The widget under the finger; null when nothing is lifted.
+    // The widget under the finger; null if no item is lifted.
     KSBaseItemWidget* moving() const { return m_moving; }
     KSBaseItemWidget* item() const { return m_item; }
     int dropIndex() const { return m_dropIndex; }
-    // The size of the place that is kept.
+    // Sets the size of the placeholder.
     void setSize(const QSize& size) { m_size = size; }
 
-    // Takes the item, which is in the list, out of it and lets its clone float over the parent, whose
-    // coordinates the position is in.
+    // Removes the item from the list and lets its clone float above the parent. position is in coordinates of
+    // the parent.
     void lift(KSBaseItemWidget* item, DragFlagAlignment listAlignment, QWidget* parent,
               const QPoint& position);
-    // Clone and pointer part in y only.
+    // Moves the clone vertically by dy pixels.
     void moveBy(int dy);
-    // Moves the kept place. visible is what is to be seen, in board coordinates; tall: the list does not fit.
-    // True when it changed.
+    // Moves the placeholder to where the item would be dropped. visible is the visible rectangle in board
+    // coordinates; tall is true if the list is higher than the viewer. Returns whether the placeholder moved.
     bool updateIndicator(const QRect& visible, bool tall);
-    // The place where the item would drop now.
+    // Returns the index at which the item would be dropped now.
     int getDropIndicatorID(const QRect& visible, bool tall) const;
-    // Puts the item back into the list at the kept place and returns it; null when it is gone.
+    // Inserts the item at the placeholder and returns it; null if it was destroyed.
     KSBaseItemWidget* drop();
-    // Moves the kept place to where the item was lifted.
+    // Sets the position of the drop to where the item was lifted.
     void returnToOrigin() { m_dropIndex = m_origin; }
-    // Nothing is put back.
+    // Ends the drag without inserting the item.
     void abandon();
-    // The clone of the last drop, which the next drag deletes.
+    // Hides the clone of the last drop, which is deleted by the next drag.
     void hideLastClone();
 
-    // Position of the floating widget's top, in the coordinates of the viewer.
+    // Returns the top of the floating widget in coordinates of the viewer.
     int topIn(const QWidget* viewer) const;
     int height() const;
 
@@ -62,7 +62,7 @@ private:
 
     ScrollViewerBoard& m_board;
     QPointer<KSBaseItemWidget> m_item;
-    QPointer<KSBaseItemWidget> m_moving; // m_item itself when it has no clone
+    QPointer<KSBaseItemWidget> m_moving; // m_item itself if it has no clone
     QPointer<KSBaseItemWidget> m_lastClone;
     QSize m_size;
     int m_origin = -1;

@@ -6,27 +6,27 @@
 #include <QPoint>
 #include <QPointer>
 
-// The press under way on a scroll viewer: who does it, on which item, whether it is still a tap, may become a
-// hold or the lifting of an item. Positions are in the viewer's coordinates unless said otherwise.
+// The current press on a scroll viewer: the pointer, the item, and whether the press is still a tap or may
+// become a hold or lift the item. Positions are in the viewer's coordinates unless stated otherwise.
 class ScrollViewerPress
 {
 public:
     static constexpr int HOLD_TIME = 700; // ms
-    static constexpr int POPUP_TIME = 50; // ms on a drag handle until the item is lifted
-    // Who presses.
+    static constexpr int POPUP_TIME = 50; // ms of a press on a drag handle before the item is lifted
+    // The device of the press.
     enum class Pointer { None, Finger, Mouse };
 
-    // value is the scroll bar's.
+    // value is that of the scroll bar.
     void begin(Pointer by, const QPoint& position, int value);
-    // The press does not count any more: its end does nothing.
+    // Ends the press without any effect; its lift is ignored.
     void drop() { pointer = Pointer::None; }
     bool isActive() const { return pointer != Pointer::None; }
     void clearItem();
     void stopTimers();
 
-    // Whether the press has left the room of a tap.
+    // Returns whether the press has moved further than a tap allows.
     bool isBeyondSlop(const QPoint& position) const;
-    // Where the viewer's edges hold the item: the finger's lowest and highest y.
+    // Sets the lowest and highest y of the finger between which the pressed item stays inside the viewer.
     void calculateBounds(int itemHeight, int viewerHeight);
     bool isOutside(int y) const { return y < upperBound || y > lowerBound; }
 
@@ -39,7 +39,7 @@ public:
     int valueAtPress = 0;
     int upperBound = 0;
     int lowerBound = 0;
-    bool moved = false; // the list has scrolled since the press
+    bool moved = false; // the list has scrolled since the press began
     bool willFlick = false;
     bool outOfBounds = false;
     bool dragAreaPressed = false;

@@ -4,7 +4,7 @@
 
 class KSBaseItemWidget;
 
-// A row of a scroll viewer whose widget is made when it comes into view or is asked for. GUI thread only.
+// A row of a scroll viewer whose widget is created when it becomes visible or is requested. GUI thread only.
 class ScrollViewerRow
 {
 public:
@@ -13,8 +13,8 @@ public:
     ScrollViewerRow(const ScrollViewerRow&) = delete;
     ScrollViewerRow& operator=(const ScrollViewerRow&) = delete;
 
-    // Size of the widget in pixels.
+    // Returns the size of the widget in pixels.
     virtual QSize size() const = 0;
-    // Makes a widget of that size, which passes to the viewer. Must not change the list.
+    // Creates a widget of that size, which the viewer then owns. Must not change the list.
     virtual KSBaseItemWidget* makeWidget() = 0;
 };

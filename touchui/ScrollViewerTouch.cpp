@@ -24,7 +24,7 @@ ScrollViewerTouch::ScrollViewerTouch(KSScrollViewerWidget& list, ScrollViewerBoa
     connect(&m_drag.edgeTimer, &TouchTimer::timeout, this, &ScrollViewerTouch::scrollAtEdge);
 }
 
-// Touch
+// --- Touch --------------------------------------------------------------------------------------------
 
 bool ScrollViewerTouch::take(QObject* object, QTouchEvent* event)
 {
@@ -47,7 +47,7 @@ bool ScrollViewerTouch::take(QObject* object, QTouchEvent* event)
     return result;
 }
 
-// A finger on a list in flight stops it and presses nothing.
+// A touch on a gliding list only stops it.
 void ScrollViewerTouch::brake(const QPoint& pos)
 {
     m_press.drop();
@@ -166,7 +166,7 @@ void ScrollViewerTouch::passOnAsMouse()
     }
 }
 
-// Press
+// --- Press --------------------------------------------------------------------------------------------
 
 void ScrollViewerTouch::setEffectiveArea(int left, int width)
 {
@@ -261,8 +261,8 @@ void ScrollViewerTouch::reportMove(const QPoint& pos)
         Q_EMIT movedOver(m_press.item, inPressedItem(pos));
 }
 
-// Whether the press is further from where it began than a tap may be; then it is no hold, and may become a
-// motion.
+// Returns whether the press has moved further than a tap allows. If so, stops the hold and reports the press
+// as a possible flick.
 bool ScrollViewerTouch::leavesTap(const QPoint& pos)
 {
     if (!m_press.isBeyondSlop(pos))
@@ -290,7 +290,7 @@ bool ScrollViewerTouch::isInsidePressedItem(const QPoint& pos) const
     return m_press.item && m_press.item->rect().contains(inPressedItem(pos));
 }
 
-// The item may float in another window.
+// Converts by global coordinates, because the item may float in another window.
 QPoint ScrollViewerTouch::inPressedItem(const QPoint& pos) const
 {
     return m_press.item->mapFromGlobal(m_list.mapToGlobal(pos));
@@ -299,8 +299,8 @@ QPoint ScrollViewerTouch::inPressedItem(const QPoint& pos) const
 void ScrollViewerTouch::fingerLifted(const QPoint& pos)
 {
     m_press.popup.stop();
-    // A list that runs on has been moved, even when its first tick is still to come; a finger that slid a
-    // little is a tap all the same.
+    // A gliding list counts as moved, even before its first tick; a finger that only slid a little is still a
+    // tap.
     const QScrollBar* bar = m_list.verticalScrollBar();
     if ((m_press.willFlick || m_flicker.isMove()) && m_flicker.isGliding() && bar->maximum() > bar->minimum())
         m_press.moved = true;
@@ -329,7 +329,7 @@ void ScrollViewerTouch::endPress(const QPoint& pos)
     }
 }
 
-// A release beside the pressed item is not reported.
+// Does not report a release outside the pressed item.
 void ScrollViewerTouch::reportEnd(const QPoint& pos, bool moved)
 {
     if (m_press.item && !isInsidePressedItem(pos))
@@ -341,7 +341,7 @@ void ScrollViewerTouch::reportEnd(const QPoint& pos, bool moved)
         Q_EMIT released(m_press.item, place);
 }
 
-// Mouse
+// --- Mouse --------------------------------------------------------------------------------------------
 
 void ScrollViewerTouch::mousePressed(const QMouseEvent* event)
 {
@@ -391,7 +391,7 @@ void ScrollViewerTouch::moveAll(const QPoint& pos)
     m_press.last = pos;
 }
 
-// Drag
+// --- Drag ---------------------------------------------------------------------------------------------
 
 void ScrollViewerTouch::startDrag(KSBaseItemWidget* item)
 {
@@ -412,7 +412,7 @@ void ScrollViewerTouch::startDrag()
     if (m_drag.isActive() || !item || m_board.indexOf(item) < 0)
         return;
     m_press.stopTimers();
-    // The finger moves the item now and not the list.
+    // From now on the finger moves the item instead of the list.
     m_flicker.setAble(false);
     m_flicker.rest();
     Q_EMIT dragStarts(item, m_press.index);

@@ -18,23 +18,24 @@ class QMouseEvent;
 class QTouchEvent;
 class ScrollViewerBoard;
 
-// What fingers and mouse do to a scroll viewer: the flick, the press on an item or beside it, the hold, and
-// the drag of an item by its handle.
+// Handles touch and mouse events of a scroll viewer: the flick, the press on an item or an empty area, the
+// hold, and the drag of an item by its handle.
 //
-// Positions are in coordinates of the list; in signals they are the item's, or the list's when the item is
-// null. GUI thread only.
+// Positions are in coordinates of the list; in signals they are in coordinates of the item, or of the list if
+// the item is null. GUI thread only.
 class ScrollViewerTouch : public QObject
 {
     Q_OBJECT
 public:
-    // Neither is owned; both outlive this object. The list's scroll bar is there by the time of the first
+    // Neither is owned; both must outlive this object. The list's scroll bar must exist before the first
     // event.
     ScrollViewerTouch(KSScrollViewerWidget& list, ScrollViewerBoard& board);
 
-    // Takes a touch that was sent to the list, its viewport, an item or a widget in an item. True when it
-    // goes no further.
+    // Handles a touch that was sent to the list, its viewport, an item or a widget in an item. Returns
+    // whether the event needs no further handling.
     bool take(QObject* object, QTouchEvent* event);
-    // Follows the finger's last event. True when it belongs to the motion and goes no further.
+    // Handles the finger's last event as a scroll motion. Returns whether the event needs no further
+    // handling.
     bool followMotion();
     void passOnAsMouse();
     void fingerPressed(const QPoint& pos);
@@ -43,50 +44,50 @@ public:
     void mousePressed(const QMouseEvent* event);
     void mouseMoved(const QMouseEvent* event);
     void mouseReleased(const QMouseEvent* event);
-    // Nothing is tapped or held, nothing goes on moving, and what is lifted returns to its place.
+    // Ends the press without a tap or hold, stops any motion, and returns a lifted item to its position.
     void rest();
 
     Flicker& flicker() { return m_flicker; }
     const Flicker& flicker() const { return m_flicker; }
-    // One tick: how far the contents move.
+    // Calculates one tick; returns the distance by which the contents move.
     QPointF getDistance() { return m_flicker.advance(dragBounds()); }
-    // Scrolls the contents down by the offset, within the range.
+    // Scrolls the contents down by offset pixels, within the range.
     void scrollBy(int offset);
 
     KSBaseItemWidget* pressedItem() const { return m_press.item; }
-    // Whether the item is pressed, or a finger is on it.
+    // Returns whether the item is pressed or touched.
     bool isUsing(const KSBaseItemWidget* item) const;
-    // For an item that has left the list: the press on it counts no more, and the finger gets no further.
+    // Call when an item was removed from the list: ends the press on it and cancels its touch.
     void forget(const KSBaseItemWidget* item);
-    // Only the finger: others may come.
+    // Cancels only the touch of the item, not its press.
     void breakTouchOf(const KSBaseItemWidget* item);
     void stopHold() { m_press.hold.stop(); }
-    // Restarts those timers of press and drag that run.
+    // Restarts the press and drag timers that are running.
     void restartTimers();
 
-    // Presses beside it select nothing.
+    // Sets the horizontal range outside of which presses select no item.
     void setEffectiveArea(int left, int width);
-    // While set, a touch is left to the item under it.
+    // While set, the list does not handle touches that begin, but leaves them to the item under the finger.
     void setIsTake(bool isTake) { m_isTake = isTake; }
-    // Returns the old one.
+    // Returns the status that was set before.
     bool setMinitrimStatus(bool status) { return std::exchange(m_minitrim, status); }
 
     bool itemsCanDrag() const { return m_itemsCanDrag; }
-    // Drops what is lifted when it is switched off.
+    // Switching it off drops a lifted item.
     void setItemsCanDrag(bool canDrag);
     DragFlagAlignment dragAlignment() const { return m_dragAlignment; }
-    // For items that have none of their own.
+    // Applies to items that have no alignment of their own.
     void setDragAlignment(DragFlagAlignment alignment) { m_dragAlignment = alignment; }
     bool isDragging() const { return m_drag.isActive(); }
-    // The widget under the finger, and the item that it is or stands for; null when nothing is lifted.
+    // The widget under the finger, and the lifted item, which may be the same; null if no item is lifted.
     KSBaseItemWidget* movingWidget() const { return m_drag.moving(); }
     KSBaseItemWidget* liftedItem() const { return m_drag.item(); }
-    // Lifts an item of the list, or the one that is pressed.
+    // Lifts an item of the list, or the pressed item.
     void startDrag(KSBaseItemWidget* item);
     void startDrag();
-    // The list changes under the finger: what was lifted is not put back.
+    // Ends the drag without putting the lifted item back. For changes of the list during a drag.
     void abandonDrag();
-    // Moves the place that is kept for the lifted item to where it would drop now.
+    // Moves the placeholder to where the lifted item would be dropped now.
     void updateIndicator();
 
 public Q_SLOTS:
@@ -97,18 +98,19 @@ Q_SIGNALS:
     void pressed(KSBaseItemWidget* item, QPoint pos);
     void rightPressed(KSBaseItemWidget* item, QPoint pos);
     void held(KSBaseItemWidget* item, QPoint pos);
-    // A press has left the room of a tap. Who sets willFlick makes it one that ends in no tap.
+    // Emitted when a press has moved further than a tap allows. If a receiver sets willFlick, the press does
+    // not end as a tap.
     void flicked(KSBaseItemWidget* item, QPoint pos, bool& willFlick);
     void movedOver(KSBaseItemWidget* item, QPoint pos);
     void released(KSBaseItemWidget* item, QPoint pos);
     void releasedAfterMotion(KSBaseItemWidget* item, QPoint pos);
     void clicked(KSBaseItemWidget* item, QPoint pos);
-    // The mouse has left the room of a tap and may drag the list.
+    // Emitted when the mouse has moved further than a tap allows and may drag the list.
     void mouseDrags();
-    // Before the item leaves the list.
+    // Emitted before the lifted item leaves the list.
     void dragStarts(KSBaseItemWidget* item, int index);
     void dragStarted();
-    // The item is back in the order: the list lays its items out.
+    // Emitted when the item is back in the order; the list updates its layout.
     void dropped();
 
 private:

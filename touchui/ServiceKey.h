@@ -7,17 +7,17 @@
 class QEvent;
 class QKeyEvent;
 
-// The keys that go between a field and the keyboard service.
+// Converts keys between a field and the keyboard service.
 namespace ServiceKey
 {
 
-// The record of a key press; nothing for other events.
+// Returns the record of a key press; nothing for other events.
 std::optional<SubCommonDefine::tagSoftKeyBoardKeyData> ofPress(const QEvent* event);
-// Whether the record is of a key press or release: no other event may be made into a key event.
+// Returns whether the record is a key press or release. Other records must not be converted to key events.
 bool isKey(const SubCommonDefine::tagSoftKeyBoardKeyData& data);
-// The event of such a record, not repeated and with a count of 1.
+// Returns the event of such a record, not as an auto repeat and with a count of 1.
 QKeyEvent toEvent(const SubCommonDefine::tagSoftKeyBoardKeyData& data);
-// Whether the event is a press or release of Tab, Space, Home, End, a page key or F1 to F12.
+// Returns whether the event is a press or release of Tab, Space, Home, End, a page key or F1 to F12.
 bool isSpecial(const QEvent* event);
 
 } // namespace ServiceKey

@@ -53,8 +53,8 @@ void SliceFrame::paintPiece(QPainter& painter, NineSlice::Piece piece, const QRe
     if (picture.isNull() || target.isEmpty()) {
         return;
     }
-    // The edges are even along the way they are stretched: smoothing would only change their colours by a
-    // level and show the joints.
+    // Smooth only the centre: edges are uniform in the direction in which they are stretched, and smoothing
+    // would change their colours slightly and make the joints visible.
     const bool smooth = painter.testRenderHint(QPainter::SmoothPixmapTransform);
     painter.setRenderHint(QPainter::SmoothPixmapTransform, piece == NineSlice::MiddleCenter);
     painter.drawPixmap(target, picture);

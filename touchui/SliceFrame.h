@@ -11,22 +11,23 @@
 
 class QPainter;
 
-// A frame that is painted from nine pictures: corners in their own size, the rest stretched between them. A
-// picture that is missing leaves its piece undrawn.
+// A frame that is painted from nine pictures: corners in their natural size, the rest stretched between them.
+// Missing pictures are not drawn.
 class SliceFrame
 {
 public:
     SliceFrame() = default;
-    // Nine resource paths in the order of NineSlice::Piece; another number leaves the frame empty.
+    // Nine resource paths in the order of NineSlice::Piece; with any other number the frame is empty.
     explicit SliceFrame(const QStringList& paths);
 
-    // The nine paths of a family: prefix + "Upper_Left" and so on; bottom is how its lower row is spelt.
+    // Returns the nine paths of a family: prefix + "Upper_Left" and so on; bottom is the word for the lower
+    // row.
     static QStringList family(const QString& prefix, const QString& bottom = QStringLiteral("Bottom"));
 
-    // In the painter's coordinates.
+    // target is in the painter's coordinates.
     void paint(QPainter& painter, const QRect& target) const;
-    // What a frame of this size covers; empty for an empty frame. A window that has it for its mask is round
-    // without a compositor, too, where what is transparent would be black.
+    // Returns the opaque region of a frame of this size; empty for an empty frame. As the mask of a window it
+    // gives round corners without a compositor, where transparent pixels would be black.
     QRegion mask(const QSize& size) const;
     void paintPiece(QPainter& painter, NineSlice::Piece piece, const QRect& target) const;
 

@@ -20,8 +20,8 @@ TouchEventButton::TouchEventButton(const QString& text, QWidget* parent) : QPush
 void TouchEventButton::init()
 {
     setAttribute(Qt::WA_AcceptTouchEvents);
-    // Qt gives the focus at touch begin, also for a touch that is refused, and a button that loses it comes
-    // up.
+    // Qt sets the focus when a touch begins, even if the touch is refused, and a button that loses the focus
+    // is released.
     setFocusPolicy(Qt::NoFocus);
     connect(this, &QAbstractButton::released, this, &TouchEventButton::slotEmitReleased);
     connect(&m_finger, &OneFinger::cancelled, this, &TouchEventButton::comeUp);
@@ -95,13 +95,13 @@ void TouchEventButton::followMotion(const QTouchEvent* event)
                          Qt::NoModifier);
         mouseMoveEvent(&move);
     } else if (step == OneFinger::Step::End && event->type() == QEvent::TouchUpdate) {
-        sendRelease(m_lastPosition, mapToGlobal(m_lastPosition)); // another finger stays
+        sendRelease(m_lastPosition, mapToGlobal(m_lastPosition)); // another finger remains down
     } else if (step == OneFinger::Step::End) {
         sendRelease(position, screenPosition);
     }
 }
 
-// The button comes up and nothing is clicked.
+// Releases the button without a click.
 void TouchEventButton::comeUp()
 {
     const QScopedValueRollback<bool> guard(m_touchCancelled, true);
@@ -124,7 +124,7 @@ void TouchEventButton::sendRelease(const QPoint& position, const QPoint& screenP
     mouseReleaseEvent(&release);
 }
 
-// A finger that is still inside the touch rectangle counts as being on the button. The low end of y is 1,
+// Moves a position outside the button but inside the touch rectangle onto the button. The smallest y is 1,
 // unlike x.
 void TouchEventButton::moveIntoWidget(QPoint& position, QPoint& screenPosition) const
 {

@@ -10,8 +10,8 @@ class QEventPoint;
 class QMouseEvent;
 class QTouchEvent;
 
-// A push button that one finger works like a mouse: touch events become mouse events of the button, and
-// further fingers are ignored until the first is lifted. Positions are in widget coordinates unless said
+// A push button that one finger operates like a mouse: touch events are converted to mouse events, and
+// further fingers are ignored until the first is lifted. Positions are in widget coordinates unless stated
 // otherwise.
 class TouchEventButton : public QPushButton
 {
@@ -24,20 +24,20 @@ public:
     virtual bool touchUpdateEvent(QTouchEvent* event);
     virtual bool touchEndEvent(QTouchEvent* event);
 
-    // A finger inside this rectangle counts as on the button, even beside it. Null turns that off.
+    // A finger inside this rectangle counts as being on the button, even beside it. Null for none.
     void setTouchRect(const QRect& rect) { m_touchRect = rect; }
     QRect touchRect() const { return m_touchRect; }
 
-    // Ends the touch that is on it, without a click, and frees the touch lock that goes with it: for a button
-    // that is taken away from under the finger and will not see it lifted.
+    // Ends the current touch without a click and releases its touch lock. Call for a button that is removed
+    // under the finger and will not receive the lift.
     void breakTouch();
-    // True while the button comes up because its touch was cancelled, which is no release of the operator's.
+    // Returns true while the button is released because its touch was cancelled, not by the operator.
     bool isTouchCancelled() const { return m_touchCancelled; }
 
 Q_SIGNALS:
-    // outside: the finger slid off the button; false: it was lifted on it.
+    // outside is true if the finger slid off the button, false if it was lifted on it.
     void signalReleased(bool outside);
-    // Where a finger came down, in global coordinates; every finger, also a second one.
+    // Emitted for every finger that comes down, including further ones; point is in global coordinates.
     void signalPressedPoint(QPoint point);
 
 protected:

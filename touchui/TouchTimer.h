@@ -2,14 +2,13 @@
 
 #include <QObject>
 
-// The timer of the touch widgets, otherwise like QTimer. It takes its time from Qt's timers, unless another
-// clock is installed, such as one that is moved by hand. GUI thread only.
+// The timer of the touch widgets, which works like QTimer. It uses Qt's timers unless another clock is
+// installed, for example one that tests advance. GUI thread only.
 class TouchTimer : public QObject
 {
     Q_OBJECT
 public:
-    // Where timers get their time. A timer of a clock reports by a QTimerEvent at its receiver until it is
-    // stopped.
+    // A source of time for timers. A timer sends QTimerEvents to its receiver until it is stopped.
     class Clock
     {
     public:
@@ -18,14 +17,14 @@ public:
         Clock(const Clock&) = delete;
         Clock& operator=(const Clock&) = delete;
 
-        // The id of the new timer, above 0.
+        // Returns the id of the new timer, which is positive.
         virtual int start(QObject* receiver, int milliseconds) = 0;
-        // Ids that are not running are ignored.
+        // Ignores ids that are not running.
         virtual void stop(QObject* receiver, int id) = 0;
     };
 
-    // Not owned. Null goes back to Qt's timers. Timers that run stay with the clock that started them, so
-    // install it before the widgets are made.
+    // Sets the clock, which is not owned; null restores Qt's timers. Running timers remain with the clock
+    // that started them, so install a clock before the widgets are created.
     static void setClock(Clock* clock);
 
     explicit TouchTimer(QObject* parent = nullptr);
@@ -33,10 +32,10 @@ public:
 
     void setSingleShot(bool singleShot) { m_singleShot = singleShot; }
     bool isSingleShot() const { return m_singleShot; }
-    // Starts it anew when it runs already.
+    // Restarts the timer if it is running.
     void start(int milliseconds);
     void stop();
-    // Starts it anew with the time that it had, if it runs.
+    // Restarts the timer with its last time if it is running.
     void restartIfActive();
     bool isActive() const { return m_id != 0; }
 

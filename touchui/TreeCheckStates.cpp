@@ -12,7 +12,7 @@ void TreeCheckStates::toggle(const QModelIndex& index)
     updateParents(index);
 }
 
-// Children that have not been made yet take the state of their parent when they are.
+// Children that do not exist yet take the state of their parent when they are created.
 void TreeCheckStates::setChildren(const QModelIndex& index, Qt::CheckState state)
 {
     if (!m_model.areChildrenMade(index)) {

@@ -6,26 +6,26 @@
 
 class KSTreeModel;
 
-// Turns the marks of a tree's rows that are loading. A row's loading role holds the step that its mark shows,
-// from 1 on; 0 is not loading. GUI thread only.
+// Animates the marks of a tree's rows that are loading. A row's loading role contains the step that its mark
+// shows, beginning with 1; 0 if it is not loading. GUI thread only.
 class TreeLoadingMarks : public QObject
 {
     Q_OBJECT
 public:
     TreeLoadingMarks();
 
-    // step counts from 1 to 8; others are taken round.
+    // step counts from 1 to 8; other values wrap around.
     static QString imagePath(int step);
 
-    // The model is not owned. Null turns nothing.
+    // The model is not owned. Null for none.
     void setModel(KSTreeModel* model) { m_model = model; }
     void start();
     void stop() { m_timer.stop(); }
-    // Starts the time of a step once more, if the marks turn.
+    // Restarts the time of a step if the animation is running.
     void restartIfActive();
 
 public Q_SLOTS:
-    // Shows the next step of each mark; stops when no row is loading any more.
+    // Shows the next step of each mark; stops when no row is loading.
     void turn();
 
 private:

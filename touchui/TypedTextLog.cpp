@@ -7,7 +7,7 @@
 
 #include <algorithm>
 
-// An entry is one line.
+// Writes the text as a single entry of one line.
 void TypedTextLog::write(QString text)
 {
     const auto isControl = [](QChar sign) { return sign.category() == QChar::Other_Control; };

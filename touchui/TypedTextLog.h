@@ -2,11 +2,11 @@
 
 class QString;
 
-// The entries of the operation log about what the operator has typed.
+// Writes the operator's typed text to the operation log.
 namespace TypedTextLog
 {
 
-// Writes nothing for an empty text and one of control characters only, as Enter and Backspace bring them.
+// Ignores an empty text and one of control characters only, as Enter and Backspace produce.
 void write(QString text);
 
 } // namespace TypedTextLog

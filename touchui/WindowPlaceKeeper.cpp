@@ -7,7 +7,7 @@
 namespace
 {
 
-// A window manager that will not have the window there is not asked again until the window is shown again.
+// How often a window manager that refuses the position is asked again after each show.
 constexpr int MAX_TRIES = 3;
 
 } // namespace
@@ -27,13 +27,13 @@ bool WindowPlaceKeeper::eventFilter(QObject* object, QEvent* event)
         mTries = MAX_TRIES;
         break;
     case QEvent::Move:
-        // The window system's word is spontaneous, the program's own is not.
+        // The window system moves a window spontaneously, the program does not.
         if (event->spontaneous())
             QMetaObject::invokeMethod(this, &WindowPlaceKeeper::check, Qt::QueuedConnection);
         else
             mPlace = mWindow->pos();
         break;
-    case QEvent::WindowActivate: // the window manager is done with it
+    case QEvent::WindowActivate: // the window manager has placed the window by now
         check();
         break;
     default:
@@ -48,6 +48,6 @@ void WindowPlaceKeeper::check()
     if (!window || !mWindow->isVisible() || mTries == 0 || window->position() == mPlace)
         return;
     --mTries;
-    // Also when it is there already: the window manager answers with the true place.
+    // Set it even if the window is already there: the window manager replies with the true position.
     window->setPosition(mPlace);
 }

@@ -1,10 +1,3 @@
-// Keeps a frameless window where the program has put it, and what Qt knows of its place true.
-//
-// A window manager that takes a window over while Qt asks the display server for its place makes Qt believe
-// in a place where the window is not, for as long as the window lives. A mouse brings its own place in the
-// window along; touches are counted from where Qt believes the window to be, and would miss every button.
-//
-// A child of the window that it watches. GUI thread.
 #pragma once
 
 #include <QObject>
@@ -12,6 +5,14 @@
 
 class QWidget;
 
+// Keeps a frameless window at the position that the program has set, and corrects Qt's record of its
+// position.
+//
+// If a window manager takes over a window while Qt queries its position from the display server, Qt keeps a
+// wrong position for the lifetime of the window. Mouse events contain their position in the window, but touch
+// positions are calculated from the recorded one and would miss every button.
+//
+// A child of the window that it watches. GUI thread.
 class WindowPlaceKeeper : public QObject
 {
     Q_OBJECT
@@ -25,6 +26,6 @@ private:
     void check();
 
     QWidget* mWindow;
-    QPoint mPlace; // where the program has put the window, global
+    QPoint mPlace; // the position set by the program, global
     int mTries = 0;
 };

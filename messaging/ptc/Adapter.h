@@ -1,4 +1,3 @@
-// Base of the adapters of offered services.
 #pragma once
 
 #include "messaging/ptc/IAdapterBase.h"
@@ -8,6 +7,7 @@ namespace PTC
 
 class IProxyBase;
 
+// Base class of the adapters of services that this process offers.
 class Adapter : public IAdapter
 {
 public:
@@ -15,7 +15,7 @@ public:
 
     long getId() override;
     void setProxyFactory(IProxyFactory* factory) override;
-    // The proxy factory's answer, null without a factory.
+    // Returns a proxy from the proxy factory, owned by the caller; null without a factory.
     virtual IProxyBase* createProxy(long type, long id, long client);
 
 private:

@@ -8,7 +8,7 @@
 namespace
 {
 
-// Writes the tag and the low bytes of value, the highest first.
+// Writes the tag and then the lowest bytes of value, most significant byte first.
 unsigned long putTagged(unsigned char* p, unsigned char tag, std::uint64_t value, int bytes)
 {
     *p++ = tag;

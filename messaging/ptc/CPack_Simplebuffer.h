@@ -1,4 +1,3 @@
-// Packs one value at the end of a buffer. Each returns true on success, false when there is no memory.
 #pragma once
 
 #include "messaging/ptc/CSimpleBuffer.h"
@@ -6,6 +5,7 @@
 #include <cstdint>
 #include <string>
 
+// Appends packed values to a buffer. Each function returns false if memory is short.
 class CPack_Simplebuffer
 {
 public:
@@ -23,14 +23,14 @@ public:
     static bool pack_simplebuffer_uint16(simplebuffer* buffer, std::uint16_t value);
     static bool pack_simplebuffer_uint32(simplebuffer* buffer, std::uint32_t value);
     static bool pack_simplebuffer_uint64(simplebuffer* buffer, std::uint64_t value);
-    // The smallest form of the value.
+    // Pack the value in its shortest form.
     static bool pack_simplebuffer_int(simplebuffer* buffer, int value);
     static bool pack_simplebuffer_uint(simplebuffer* buffer, unsigned int value);
     static bool pack_simplebuffer_raw_header(simplebuffer* buffer, std::uint32_t length);
     static bool pack_simplebuffer_raw(simplebuffer* buffer, const void* data, std::uint32_t length);
-    // A raw of the bytes and a NUL, which the length counts.
+    // Packs the text and a terminating NUL as raw data; the length includes the NUL.
     static bool pack_simplebuffer_string(simplebuffer* buffer, const std::string& text);
-    // The same of the multi-byte form; see support/LocaleText.h.
+    // Packs the multi-byte form of the text in the same way; see support/LocaleText.h.
     static bool pack_simplebuffer_wstring(simplebuffer* buffer, const std::wstring& text);
     // The format has no arrays: writes nothing and returns 0.
     static unsigned long pack_simplebuffer_array_header(simplebuffer* buffer, std::uint32_t count);

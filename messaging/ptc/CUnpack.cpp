@@ -9,7 +9,7 @@
 namespace
 {
 
-// Bytes of the number behind a tag, -1 for an unknown tag.
+// Returns the size in bytes of the number behind a tag, or -1 for an unknown tag.
 int numberSize(unsigned char tag)
 {
     switch (tag) {

@@ -1,4 +1,3 @@
-// Reads one packed value.
 #pragma once
 
 #include <cstdint>
@@ -18,26 +17,27 @@ struct unpack_info_t {
     int type = UNPACK_NIL;
     union {
         std::int64_t i64;
-        std::uint64_t u64 = 0; // unsigned numbers, 0 or 1 of a bool, the length of a raw
+        std::uint64_t u64 = 0; // an unsigned number, 0 or 1 for a bool, or the length of raw data
         float f;
         double d;
     } value;
-    unsigned char* raw = nullptr; // start of a raw's bytes, inside the message
+    unsigned char* raw = nullptr; // start of raw data, points into the message
 
     std::int64_t asInteger() const { return value.i64; }
 };
 
+// Reads one packed value.
 class CUnpack
 {
 public:
-    // Reads tag and number at p into this object and returns the bytes they take, 0 for an unknown tag. The
-    // first form trusts the message; the second reads at most available bytes and returns 0 when the value is
-    // not all there, a raw's bytes included.
+    // Reads tag and number at p into this object. Returns the number of bytes read, or 0 for an unknown tag.
+    // The first form trusts the message; the second reads at most available bytes and returns 0 if the value,
+    // including the bytes of raw data, is incomplete.
     unsigned long unpack_base(unsigned char* p);
     unsigned long unpack_base(unsigned char* p, unsigned long available);
 
-    // Reads one value into info and returns the bytes consumed. An unknown tag, and in the second form a
-    // value that goes beyond available, consumes nothing and leaves info as it was.
+    // Reads one value into info and returns the number of bytes consumed. For an unknown tag, and in the
+    // second form for a value longer than available, returns 0 and leaves info unchanged.
     static unsigned long unpack(unpack_info_t* info, unsigned char* p);
     static unsigned long unpack(unpack_info_t* info, unsigned char* p, unsigned long available);
 
@@ -49,6 +49,5 @@ private:
     unsigned char* m_raw = nullptr;
 };
 
-// Wide form of the multi-byte text of length bytes at pointer, ended by the first NUL; see
-// support/LocaleText.h.
+// Converts length bytes of multi-byte text, up to the first NUL; see support/LocaleText.h.
 std::wstring s2ws(const char* pointer, unsigned long length);

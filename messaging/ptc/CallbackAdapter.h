@@ -1,4 +1,3 @@
-// Base of the adapters of callbacks and notifications.
 #pragma once
 
 #include "messaging/ptc/IAdapterBase.h"
@@ -6,6 +5,7 @@
 namespace PTC
 {
 
+// Base class of the adapters that receive callbacks and notifications.
 class CallbackAdapter : public IAdapterBase
 {
 public:

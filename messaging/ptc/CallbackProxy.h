@@ -1,5 +1,3 @@
-// Base of the proxies with which a server calls what a client has registered. Its id is the client's adapter
-// id.
 #pragma once
 
 #include "messaging/ptc/IProxyBase.h"
@@ -7,6 +5,8 @@
 namespace PTC
 {
 
+// Base class of the proxies with which a server calls the callbacks of a client. Its id is the id of the
+// client's adapter.
 class CallbackProxy : public IProxyBase
 {
 public:
@@ -15,7 +15,7 @@ public:
     long getId() override;
     void setSender(ISender* sender) override;
 
-    // Sends a call for the callback adapters of the peer; the data stays the caller's.
+    // Sends a call to the callback adapter of the peer; the caller keeps the data.
     virtual void invokeMethod(long methodId, void* data, long size);
 
 private:

@@ -1,17 +1,16 @@
-// The socket of an outgoing connection to 127.0.0.1. Nothing here blocks, but for the two operations that say
-// how long they wait.
-//
-// Not locked. waitUntilConnected, waitForRoom and interrupt may run beside each other; everything else needs
-// a lock of the owner.
 #pragma once
 
+// The socket of an outgoing connection to 127.0.0.1. Only waitUntilConnected and waitForRoom block.
+//
+// Not synchronised. waitUntilConnected, waitForRoom and interrupt may run concurrently; all other calls need
+// a lock of the owner.
 class ClientSocket
 {
 public:
     enum class Outcome {
-        Done,    // all of it
-        Pending, // the rest is still to come
-        Failed,  // the connection is of no use any more
+        Done,    // completed
+        Pending, // not complete yet
+        Failed,  // the connection is unusable
     };
 
     ClientSocket() = default;
@@ -19,31 +18,31 @@ public:
     ClientSocket(const ClientSocket&) = delete;
     ClientSocket& operator=(const ClientSocket&) = delete;
 
-    // Begins a connection in place of the one there is. Failed when nobody listens, Pending while the
-    // listener has no room. Errors of the local socket are printed to standard output.
+    // Closes the current connection and begins a new one. Failed if nobody listens, Pending while the
+    // listener's queue is full. Errors of the local socket are printed to standard output.
     Outcome beginConnect(unsigned short port);
-    // Waits until a pending connection has come to a result.
+    // Waits at most this long until a pending connection is established or has failed.
     void waitUntilConnected(int milliseconds) const;
-    // The result so far; with Failed the socket is closed.
+    // Returns the result so far. If it is Failed the socket is closed.
     Outcome finishConnect();
 
     bool isConnecting() const { return m_state == State::Connecting; }
     bool isOpen() const { return m_state == State::Open; }
-    // Whether the peer has closed an open connection.
+    // Returns whether the peer has closed an open connection.
     bool peerHasClosed() const;
 
-    // Writes what is left of a frame whose first used bytes are given and whose others are zero. sent counts
-    // the bytes that have gone and is moved on.
+    // Writes the rest of a frame that consists of used bytes at bytes, padded with zeros. sent is the number
+    // of bytes that have been written and is advanced.
     Outcome writeFrame(const char* bytes, long used, long& sent);
-    // Takes at most this many bytes of acknowledgements.
+    // Reads and discards at most this many bytes of acknowledgements.
     void takeAcknowledgements(int most);
-    // Waits, without limit, until the peer takes more, and takes its acknowledgements meanwhile: a peer that
-    // is held up in sending them would never read on. False when the connection has ended.
+    // Waits without limit until the socket can be written, and discards acknowledgements meanwhile: a peer
+    // that cannot send them would stop reading. Returns false when the connection has ended.
     bool waitForRoom();
-    // Bytes that have been written and have not arrived at the peer.
+    // Returns the number of bytes that have been written but have not arrived at the peer.
     long undelivered() const;
 
-    // Ends a wait in another thread; the connection is of no use afterwards.
+    // Ends a wait in another thread. The connection is unusable afterwards.
     void interrupt();
     void close();
 

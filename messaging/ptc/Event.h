@@ -1,9 +1,9 @@
-// One call on its way: whom it is for, which method, and the packed arguments.
 #pragma once
 
 namespace PTC
 {
 
+// One remote call: the object it is addressed to, the method, and the packed arguments.
 class Event
 {
 public:
@@ -19,14 +19,15 @@ public:
 
     long getObjectId() const { return m_objectId; }
     long getMethodId() const { return m_methodId; }
-    // Packed arguments of getSize() bytes. The event never frees them: the sender's belong to the caller of
-    // the proxy, the receiver's were allocated with array new and are freed by whoever handles the event.
+    // The packed arguments, getSize() bytes. The event never frees them: when sending they belong to the
+    // caller of the proxy; when receiving they were allocated with new[] and are freed by the handler of the
+    // event.
     void* getData() const { return m_data; }
     void setData(void* data) { m_data = data; }
     long getSize() const { return m_size; }
-    // Look in the callback adapters rather than in the adapters.
+    // Returns whether the event is for a callback adapter instead of a service adapter.
     bool isCallback() const { return m_callback; }
-    // The call crosses a process border.
+    // Returns whether the call is sent to another process.
     bool isRemote() const { return m_remote; }
 
 private:

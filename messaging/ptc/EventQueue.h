@@ -1,4 +1,3 @@
-// A list of events that owns them, but not their data.
 #pragma once
 
 #include <vector>
@@ -8,6 +7,7 @@ namespace PTC
 
 class Event;
 
+// A list of events. Owns the events, but not their data.
 class EventQueue
 {
 public:
@@ -16,11 +16,11 @@ public:
     EventQueue(const EventQueue&) = delete;
     EventQueue& operator=(const EventQueue&) = delete;
 
-    // Takes the event over.
+    // Takes ownership of the event.
     void add(Event* event);
-    // Null when index is out of range.
+    // Returns null if index is out of range.
     Event* at(unsigned long index) const;
-    // Deletes the event; out of range does nothing.
+    // Deletes the event; does nothing if index is out of range.
     void remove(unsigned long index);
     unsigned long count() const;
     unsigned long capacity() const;

@@ -1,4 +1,3 @@
-// What a receiver hands its events to: an adapter unpacks the arguments and calls its target.
 #pragma once
 
 #include "messaging/ptc/IObject.h"
@@ -9,19 +8,20 @@ namespace PTC
 class Event;
 class IProxyFactory;
 
+// Receives the events of one object: unpacks the arguments and calls the target.
 class IAdapterBase : public IObject
 {
 public:
-    // Unpacks the event and calls the target. Unknown method ids do nothing. The event stays the caller's.
+    // Unpacks the event and calls the target; ignores unknown method ids. The caller keeps the event.
     virtual void receive(Event* event) = 0;
-    // Takes a pointer to the interface that the adapter serves, as void*. Not owned.
+    // Sets the target: a pointer to the interface that the adapter serves, as void*. Not owned.
     virtual void setTarget(void* target) = 0;
 };
 
 class IAdapter : public IAdapterBase
 {
 public:
-    // Makes the proxies of the callbacks that peers register. Not owned.
+    // Sets the factory of the proxies for callbacks that peers register. Not owned.
     virtual void setProxyFactory(IProxyFactory* factory) = 0;
 };
 

@@ -1,4 +1,3 @@
-// Makes the adapters that take the answers of a service.
 #pragma once
 
 namespace PTC
@@ -7,14 +6,15 @@ namespace PTC
 class IAdapterBase;
 class IReceiver;
 
+// Creates the adapters that receive the answers of a service.
 class IAdapterFactory
 {
 public:
     virtual ~IAdapterFactory() = default;
-    // A new adapter of that type with a fresh id, given to the receiver, which owns it. target is a pointer
-    // to the interface of the type. Null for an unknown type.
+    // Creates an adapter of that type with a new id and adds it to the receiver, which owns it. target points
+    // to the interface of the type. Returns null for an unknown type.
     virtual IAdapterBase* createAdapter(long type, IReceiver* receiver, void* target) = 0;
-    // The client number of this process, -1 when it does not listen.
+    // Returns the client number of this process, or -1 if it does not listen.
     virtual long getRRIdentity() = 0;
 };
 

@@ -1,15 +1,15 @@
-// Makes the proxies of services by interface id.
 #pragma once
 
 namespace PTC
 {
 
+// Creates the proxies of services by interface id.
 class IInstanceFactory
 {
 public:
     virtual ~IInstanceFactory() = default;
     virtual bool initialize() = 0;
-    // Writes a pointer to the interface, as void*, into instance. An unknown id leaves it untouched.
+    // Stores a pointer to the interface, as void*, in instance. Leaves instance unchanged for an unknown id.
     virtual void createInstance(long id, void** instance) = 0;
 };
 

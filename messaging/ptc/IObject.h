@@ -1,10 +1,10 @@
-// Root of the remote call framework's interfaces. Ids name an interface, an adapter object, a receiver or a
-// client.
 #pragma once
 
 namespace PTC
 {
 
+// Root of the interfaces of the remote call framework. The id is that of an interface, an adapter, a receiver
+// or a client, depending on the subclass.
 class IObject
 {
 public:

@@ -1,4 +1,3 @@
-// Stands for an object in another process: packs the arguments of a call and hands them to a sender.
 #pragma once
 
 #include "messaging/ptc/IObject.h"
@@ -10,17 +9,18 @@ class IAdapterFactory;
 class IReceiver;
 class ISender;
 
+// Represents an object in another process: packs the arguments of a call and passes them to a sender.
 class IProxyBase : public IObject
 {
 public:
-    // Not owned; must be set before the first call.
+    // Sets the sender, which is required before the first call. Not owned.
     virtual void setSender(ISender* sender) = 0;
 };
 
 class IProxy : public IProxyBase
 {
 public:
-    // Both serve to register callbacks. Not owned.
+    // Set the objects that are needed to register callbacks. Not owned.
     virtual void setAdapterFactory(IAdapterFactory* factory) = 0;
     virtual void setReceiver(IReceiver* receiver) = 0;
 };

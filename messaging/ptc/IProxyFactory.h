@@ -1,4 +1,3 @@
-// Makes the proxies of callbacks that a peer has registered.
 #pragma once
 
 namespace PTC
@@ -6,12 +5,13 @@ namespace PTC
 
 class IProxyBase;
 
+// Creates the proxies of callbacks that a peer has registered.
 class IProxyFactory
 {
 public:
     virtual ~IProxyFactory() = default;
-    // A proxy of that type for adapter id of the process with the client number, owned by the caller. Null
-    // for an unknown type and for a process that cannot be reached.
+    // Returns a proxy of that type, owned by the caller, for the adapter with that id in the process with
+    // that client number. Null for an unknown type or if the process cannot be reached.
     virtual IProxyBase* createProxy(long type, long id, long client) = 0;
 };
 

@@ -1,4 +1,3 @@
-// Takes the events of one receiver id and owns the adapters they are for.
 #pragma once
 
 #include "messaging/ptc/IObject.h"
@@ -9,19 +8,20 @@ namespace PTC
 class Event;
 class IAdapterBase;
 
+// Receives the events of one receiver id and owns their adapters.
 class IReceiver : public IObject
 {
 public:
-    // Takes the event and its data over; the data was allocated with array new.
+    // Takes ownership of the event and of its data, which was allocated with new[].
     virtual void recv(Event* event) = 0;
-    // Both take the adapter over. An adapter whose id is taken never gets an event, and lives as long as the
-    // receiver.
+    // Both take ownership of the adapter. An adapter whose id is already in use receives no events, but is
+    // kept until the receiver is destroyed.
     virtual void addAdapter(IAdapterBase* adapter) = 0;
     virtual void addCBAdapter(IAdapterBase* adapter) = 0;
     // Deletes the callback adapter with that id.
     virtual void removeCBAdapter(long id) = 0;
-    // From here on recv drops its events where it would hold their sender up, and nobody waits in it. Any
-    // thread.
+    // After this call, recv drops events instead of blocking the sender, and threads that are blocked in recv
+    // return. Any thread.
     virtual void stopReceiving() {}
 };
 

@@ -1,4 +1,3 @@
-// Takes packets from other processes and hands them to the receivers of this one.
 #pragma once
 
 #include "messaging/ptc/IObject.h"
@@ -8,14 +7,15 @@ namespace PTC
 
 class IReceiver;
 
+// Receives packets from other processes and passes them to the receivers of this process.
 class IRemoteReceiver : public IObject
 {
 public:
-    // Starts to listen as the process with that client number. False when it cannot.
+    // Starts to listen as the process with that client number. Returns false on failure.
     virtual bool initialize(long identity) = 0;
-    // The client number, -1 before initialize.
+    // Returns the client number, or -1 before initialize.
     virtual long getIdentity() = 0;
-    // Takes the receiver over.
+    // Takes ownership of the receiver.
     virtual void addReceiver(IReceiver* receiver) = 0;
 };
 

@@ -1,4 +1,3 @@
-// Takes events to another process.
 #pragma once
 
 #include "messaging/ptc/IObject.h"
@@ -10,19 +9,20 @@ namespace PTC
 
 class Event;
 
+// Sends events to another process.
 class ISender : public IObject
 {
 public:
-    // Sends and deletes the event; its data stays the caller's. Failures are not reported.
+    // Sends and deletes the event; the caller keeps its data. Failures are not reported.
     virtual void send(Event* event) = 0;
-    // False when the peer is known to be gone, so that nothing that is sent can arrive.
+    // Returns false if the peer is known not to be running, so that nothing sent to it can arrive.
     virtual bool isConnected() const { return true; }
-    // As isConnected; a connection that was lost is begun anew, without waiting for it.
+    // As isConnected, but also begins a new connection, without waiting for it, if the old one was lost.
     virtual bool reconnect() { return isConnected(); }
-    // Begins a connection to the process with that client number without waiting for it, unless there is one.
-    // False when nobody listens there.
+    // Begins a connection to the process with that client number, unless there is one, without waiting for
+    // it. Returns false if nobody listens there.
     virtual bool beginConnect(long) { return isConnected(); }
-    // Ends the sending: what still waits has until the deadline, and later calls are dropped.
+    // Stops sending: waiting events are sent until the deadline, and later ones are dropped.
     virtual void finish(std::chrono::steady_clock::time_point) {}
 };
 

@@ -9,7 +9,7 @@ namespace PTC
 namespace
 {
 
-// For the last calls to all peers together.
+// Limit for sending the last calls to all peers together.
 constexpr std::chrono::seconds FINISH_TIME(1);
 
 } // namespace
@@ -18,7 +18,7 @@ InstanceFactory::InstanceFactory() = default;
 
 InstanceFactory::~InstanceFactory()
 {
-    // Ends the threads before anything that a call could still use goes.
+    // Stop the receiving threads before anything that their calls may use is destroyed.
     m_remoteReceiver.reset();
     const auto deadline = std::chrono::steady_clock::now() + FINISH_TIME;
     for (const auto& [key, sender] : m_senders) {

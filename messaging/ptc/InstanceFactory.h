@@ -1,4 +1,3 @@
-// Owner of a process's remote receiver and of its senders.
 #pragma once
 
 #include "messaging/ptc/IAdapterFactory.h"
@@ -14,25 +13,27 @@ namespace PTC
 class IRemoteReceiver;
 class ISender;
 
+// Owns the remote receiver and the senders of a process.
 class InstanceFactory : public IInstanceFactory, public IAdapterFactory, public IProxyFactory
 {
 public:
     InstanceFactory();
-    // Gives the last calls to all peers together a second to go out.
+    // Waits at most one second in total until the last calls to all peers are sent.
     ~InstanceFactory() override;
     InstanceFactory(const InstanceFactory&) = delete;
     InstanceFactory& operator=(const InstanceFactory&) = delete;
 
-    // True; the subclass does the work.
+    // Returns true; subclasses do the work.
     bool initialize() override;
     long getRRIdentity() override;
 
 protected:
-    // The sender with that key, or null.
+    // Returns the sender with that key, or null.
     ISender* findSender(long key);
-    // Takes the sender over under its id. An entry that exists is kept, and the new sender deleted.
+    // Takes ownership of the sender and registers it under its id. If the id is in use, the existing sender
+    // is kept and the new one deleted.
     void addSender(ISender* sender);
-    // Takes the receiver over; null is allowed and deletes the one before.
+    // Takes ownership of the receiver and deletes the previous one. Null is allowed.
     void setRemoteReceiver(IRemoteReceiver* receiver);
     IRemoteReceiver* remoteReceiver();
 

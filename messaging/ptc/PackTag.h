@@ -1,13 +1,13 @@
-// First bytes of packed values.
 #pragma once
 
+// The tags, which are the first bytes of packed values.
 namespace PackTag
 {
 
 constexpr unsigned char LAST_POSITIVE_FIX = 0x7F;
 constexpr unsigned char FIRST_FIX_RAW = 0xA0;
 constexpr unsigned char LAST_FIX_RAW = 0xBF;
-constexpr unsigned char MAX_FIX_RAW = 0x1F; // longest raw of that form
+constexpr unsigned char MAX_FIX_RAW = 0x1F; // longest raw data of that form
 constexpr unsigned char NIL = 0xC0;
 constexpr unsigned char FALSE_VALUE = 0xC2;
 constexpr unsigned char TRUE_VALUE = 0xC3;

@@ -1,4 +1,3 @@
-// Base of the proxies of services.
 #pragma once
 
 #include "messaging/ptc/IProxyBase.h"
@@ -6,6 +5,7 @@
 namespace PTC
 {
 
+// Base class of the proxies of services.
 class Proxy : public IProxy
 {
 public:
@@ -16,15 +16,15 @@ public:
     void setAdapterFactory(IAdapterFactory* factory) override;
     void setReceiver(IReceiver* receiver) override;
 
-    // Sends a call; the data stays the caller's and is not needed after the return.
+    // Sends a call; the caller keeps the data, which is not used after the return.
     virtual void invokeMethod(long methodId, void* data, long size);
-    // Makes an adapter for target in this process's receiver and returns its id, -1 when the factory makes
-    // none.
+    // Creates an adapter for target in this process's receiver and returns its id, or -1 on failure.
     virtual long createAdapter(long type, void* target);
     virtual void destoryAdapter(long id);
-    // The client number of this process.
+    // Returns the client number of this process.
     virtual long getRRIdentity();
-    // False when the process of the service is known to be gone. It is looked for again with each question.
+    // Returns false if the process of the service is known not to be running. Each call begins a new
+    // connection if there is none.
     bool isConnected() const;
 
 private:

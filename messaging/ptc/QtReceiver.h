@@ -1,4 +1,3 @@
-// A receiver whose adapters live in the thread of its QObject, whatever thread an event comes from.
 #pragma once
 
 #include "messaging/ptc/Receiver.h"
@@ -11,22 +10,23 @@
 namespace PTC
 {
 
+// A receiver that calls its adapters in the thread of its QObject, whatever thread an event comes from.
 class QtReceiver : public QObject, public Receiver
 {
     Q_OBJECT
 
 public:
-    // Events that may wait for the receiving thread at one time; a sender of more is held up.
+    // Largest number of events that wait for the receiving thread; further senders are blocked.
     static constexpr int MAX_PENDING_EVENTS = 256;
 
     explicit QtReceiver(long id);
     ~QtReceiver() override;
 
-    // Posts the event to the receiver's thread. While MAX_PENDING_EVENTS wait there, another thread is held
-    // up here; the receiver's own thread is not.
+    // Posts the event to the receiver's thread. While MAX_PENDING_EVENTS are waiting, blocks the calling
+    // thread unless it is the receiver's own.
     void recv(Event* event) override;
     void stopReceiving() override;
-    // Events that wait for the receiving thread. Any thread.
+    // Returns the number of events that wait for the receiving thread. Any thread.
     int pendingEvents();
 
 protected:

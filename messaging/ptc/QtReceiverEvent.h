@@ -1,4 +1,3 @@
-// Carries one PTC::Event through the Qt event queue.
 #pragma once
 
 #include <QEvent>
@@ -8,12 +7,13 @@ namespace PTC
 
 class Event;
 
+// Carries one PTC::Event through the Qt event queue.
 class QtReceiverEvent : public QEvent
 {
 public:
     static constexpr int TYPE = 65534;
 
-    // Owns the event with its data until takeEvent().
+    // Takes ownership of the event and its data, until takeEvent().
     explicit QtReceiverEvent(Event* event);
     ~QtReceiverEvent() override;
 

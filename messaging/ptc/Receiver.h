@@ -1,4 +1,3 @@
-// Finds the adapter of an event. Its maps belong to the thread that handles the events.
 #pragma once
 
 #include "messaging/ptc/IReceiver.h"
@@ -10,6 +9,7 @@
 namespace PTC
 {
 
+// Passes each event to its adapter. The maps are used only in the thread that handles the events.
 class Receiver : public IReceiver
 {
 public:
@@ -19,13 +19,13 @@ public:
     Receiver& operator=(const Receiver&) = delete;
 
     long getId() override;
-    // Handles the event in the caller's thread, and frees it with its data.
+    // Handles the event in the calling thread and frees it with its data.
     void recv(Event* event) override;
     void addAdapter(IAdapterBase* adapter) override;
     void addCBAdapter(IAdapterBase* adapter) override;
     void removeCBAdapter(long id) override;
 
-    // Hands the event to its adapter; without one, nothing happens. The event stays the caller's.
+    // Passes the event to its adapter; ignores it if there is none. The caller keeps the event.
     virtual void handleEvent(Event* event);
 
 private:
@@ -35,7 +35,7 @@ private:
 
     AdapterMap m_adapters;
     AdapterMap m_callbackAdapters;
-    std::vector<std::unique_ptr<IAdapterBase>> m_lostAdapters; // their ids were taken
+    std::vector<std::unique_ptr<IAdapterBase>> m_lostAdapters; // whose ids were already in use
     long m_id;
 };
 

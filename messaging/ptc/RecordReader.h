@@ -1,27 +1,28 @@
-// Reads packed values one after the other from a message that need not be well formed.
-//
-// A value that is not there, is cut off or has an unknown tag reads as zero or empty, and nothing behind the
-// message's end is looked at.
 #pragma once
 
 #include <string>
 
 struct unpack_info_t;
 
+// Reads packed values one after the other from a message that may be malformed.
+//
+// A value that is missing, truncated or has an unknown tag is read as zero or empty. Nothing beyond the end
+// of the message is accessed.
 class RecordReader
 {
 public:
-    // size below 0 reads as 0. The message must outlive the reader.
+    // A negative size is treated as 0. The message must outlive the reader.
     RecordReader(void* data, long size);
 
     int readInt();
     long readLong();
     bool readBool();
     std::wstring readWide();
-    // The bytes of a raw inside the message, and their number; null and 0 for anything else.
+    // Returns a pointer to raw data inside the message and stores its length; null and 0 if the value is of
+    // another kind.
     unsigned char* readRaw(unsigned long* length);
     bool atEnd() const { return m_left == 0; }
-    // Whether the last value could not be read.
+    // Returns whether the last value could not be read.
     bool failed() const { return m_failed; }
 
 private:

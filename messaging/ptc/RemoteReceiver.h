@@ -1,4 +1,3 @@
-// The receivers of this process by id. The map is read only once packets arrive.
 #pragma once
 
 #include "messaging/ptc/IRemoteReceiver.h"
@@ -12,6 +11,7 @@ namespace PTC
 
 struct EventPacket;
 
+// Keeps the receivers of this process by id. The map is not changed once packets arrive.
 class RemoteReceiver : public IRemoteReceiver
 {
 public:
@@ -26,19 +26,19 @@ public:
     void addReceiver(IReceiver* receiver) override;
 
     virtual void run() = 0;
-    // Hands the packet's event to its receiver, in the calling thread. An unknown receiver id drops the
-    // packet. The packet's data is taken over either way.
+    // Passes the packet's event to its receiver, in the calling thread. Drops the packet if the receiver id
+    // is unknown. Takes ownership of the packet's data in both cases.
     virtual void handleEventPacket(EventPacket* packet);
 
 protected:
-    // Lets go every thread that a receiver holds up.
+    // Releases every thread that is blocked in a receiver.
     void stopReceivers();
 
 private:
     IReceiver* findReceiver(long id);
 
     std::map<long, std::unique_ptr<IReceiver>> m_receivers;
-    std::mutex m_mutex; // the listener runs before the first addReceiver
+    std::mutex m_mutex; // the listening thread runs before the first addReceiver
     long m_id;
     long m_identity = -1;
 };

@@ -1,4 +1,3 @@
-// Base of the senders to other processes.
 #pragma once
 
 #include "messaging/ptc/ISender.h"
@@ -6,6 +5,7 @@
 namespace PTC
 {
 
+// Base class of the senders to other processes.
 class RemoteSender : public IRemoteSender
 {
 public:
@@ -14,7 +14,7 @@ public:
     long getId() override;
     void setId(long id) override;
     bool initialize(long identity) override;
-    // The peer's client number, -1 before initialize.
+    // Returns the peer's client number, or -1 before initialize.
     virtual long getIdentity();
 
 private:

@@ -45,7 +45,7 @@ SocketRemoteReceiver::~SocketRemoteReceiver()
     stopReceivers();
     const int listenSocket = m_listenSocket.exchange(-1);
     if (listenSocket != -1) {
-        shutdown(listenSocket, SHUT_RDWR); // wakes the accept
+        shutdown(listenSocket, SHUT_RDWR); // wakes up accept
     }
     if (m_acceptThread != nullptr) {
         m_acceptThread->interrupt();
@@ -133,7 +133,7 @@ void SocketRemoteReceiver::connectListeners(void* receiver)
     try {
         static_cast<SocketRemoteReceiver*>(receiver)->waitClientLink();
     } catch (const boost::thread_interrupted&) {
-        return; // the receiver ends
+        return; // the destructor has interrupted this thread
     }
 }
 
@@ -155,8 +155,8 @@ void SocketRemoteReceiver::waitClientLink()
         if (client == -1) {
             printLine("[Error]bad client!");
             if (errno != ECONNABORTED && errno != EINTR) {
-                // Out of descriptors or memory: the pending connection stays, and trying at once would only
-                // spin.
+                // Out of descriptors or memory: the connection stays pending, and an immediate retry would
+                // only spin.
                 pauseAccepting();
             }
             continue;
@@ -215,7 +215,7 @@ void SocketRemoteReceiver::ThreadEntry(void* start)
     connection->receiver->keepEndedSocket(*connection);
 }
 
-// Called as the last act of a connection's thread.
+// The last call of a connection's thread.
 void SocketRemoteReceiver::keepEndedSocket(Connection& connection)
 {
     const std::lock_guard<std::mutex> lock(m_connectionMutex);
@@ -245,7 +245,7 @@ int SocketRemoteReceiver::ThreadMain(int socket)
             return 0;
         }
         if (!sendACK(socket)) {
-            want = SocketFrame::FRAME_SIZE - got; // what was just read is read over
+            want = SocketFrame::FRAME_SIZE - got; // the next read overwrites these bytes
             continue;
         }
         got += received;

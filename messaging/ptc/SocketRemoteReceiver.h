@@ -1,9 +1,3 @@
-// Listens on 127.0.0.1 and turns the frames of every connection into event packets.
-//
-// One thread accepts, and one thread for each connection reads; handleEventPacket is called in the latter.
-// Errors at start are printed to standard output. Of connections that are open and of those that have ended,
-// whose sockets are kept, there are never more than the limits below: further connections wait to be
-// accepted, and the socket that was kept longest is closed.
 #pragma once
 
 #include "messaging/ptc/RemoteReceiver.h"
@@ -16,6 +10,12 @@
 #include <memory>
 #include <mutex>
 
+// Listens on 127.0.0.1 and converts the frames of every connection to event packets.
+//
+// One thread accepts connections, and one thread per connection reads frames and calls handleEventPacket.
+// Errors at start are printed to standard output. The sockets of ended connections are kept open for a while.
+// The limits below bound the numbers of open and of ended connections: beyond them, new connections wait to
+// be accepted, and the oldest kept socket is closed.
 class SocketRemoteReceiver : public PTC::RemoteReceiver
 {
 public:
@@ -27,25 +27,25 @@ public:
     // Closes all sockets and waits for the threads.
     ~SocketRemoteReceiver() override;
 
-    // Milliseconds between one connection and the next; before initialize.
+    // Sets the pause between two accepted connections in milliseconds. Call before initialize.
     void setAcceptPause(int milliseconds) { m_acceptPauseMs = milliseconds; }
-    // Listens on the port of that client number. False when any step fails, with the socket closed.
+    // Listens on the port of that client number. If a step fails, closes the socket and returns false.
     bool initialize(long identity) override;
     void run() override;
 
-    // Dispatches one whole frame. A payload size of 0 or less, or above the frame's room, dispatches nothing.
+    // Dispatches one whole frame. Ignores frames whose payload size is not positive or exceeds the frame.
     void executePacket(char* frame);
-    // Sends the acknowledgement; false when the connection no longer takes it.
+    // Sends the acknowledgement. Returns false if the connection no longer accepts it.
     bool sendACK(int socket);
-    // Reads one connection until it ends. -1 when there is no memory, else 0.
+    // Reads one connection until it ends. Returns -1 if memory is short, else 0.
     int ThreadMain(int socket);
     static void ThreadEntry(void* start);
     void addClientThread(int socket);
     void waitClientLink();
     static void connectListeners(void* receiver);
-    // Whether a result of recv ends the connection.
+    // Returns whether a result of recv ends the connection.
     static bool isRecvDataFailed(int received);
-    // The socket of the newest connection, -1 before the first.
+    // Returns the socket of the newest connection, or -1 before the first.
     int getLastClientSocket() const;
 
 private:
@@ -53,7 +53,7 @@ private:
         SocketRemoteReceiver* receiver = nullptr;
         int socket = -1;
         std::unique_ptr<boost::thread> thread;
-        bool ended = false; // the socket is among those that are kept
+        bool ended = false; // the socket is in m_endedSockets
     };
 
     bool prepareListeningSocket();
@@ -71,6 +71,6 @@ private:
 
     std::mutex m_connectionMutex;
     std::list<Connection>
-        m_connections;              // changed by the accept thread, and once that has ended by the destructor
-    std::deque<int> m_endedSockets; // the one that is kept longest first
+        m_connections; // changed by the accept thread and, after that has ended, by the destructor
+    std::deque<int> m_endedSockets; // oldest first
 };

@@ -18,7 +18,7 @@ namespace
 {
 
 constexpr int DRAIN_SIZE = 10;
-// A refusal on the loopback address comes at once; a busy machine may take a moment.
+// Time to wait for a refusal. On the loopback address it normally comes at once, but not on a busy machine.
 constexpr int REFUSAL_MS = 20;
 constexpr std::chrono::milliseconds DELIVERY_POLL(5);
 constexpr int LOG_NUMBER = 200;
@@ -96,7 +96,7 @@ bool SocketRemoteSender::beginConnect(long identity)
     return outcome != Outcome::Failed;
 }
 
-// Done when the connection stands, else what came of beginning it anew.
+// Returns Done if the connection is established, otherwise the result of beginning a new one.
 Outcome SocketRemoteSender::ensureConnection()
 {
     if (m_socket.isOpen() && !m_socket.peerHasClosed()) {
@@ -151,7 +151,7 @@ long SocketRemoteSender::packFrame(const PTC::Event& event)
     return SocketFrame::HEADER_SIZE + size;
 }
 
-// A peer that has gone may be there again: the frame gets a second connection, whole.
+// A peer that was restarted is reached by a second connection, on which the whole frame is sent again.
 Outcome SocketRemoteSender::sendAtOnce(long used, long& sent)
 {
     for (int connection = 0; connection < 2; ++connection) {
@@ -170,7 +170,7 @@ Outcome SocketRemoteSender::sendAtOnce(long used, long& sent)
     return Outcome::Failed;
 }
 
-// The newest calls are worth most to a peer that reads again: they say what holds by then.
+// If too many frames wait, the oldest are dropped: the newest calls report the current state.
 void SocketRemoteSender::keep(Lock& lock, long used, long sent)
 {
     if (m_waiting.empty()) {
@@ -185,7 +185,7 @@ void SocketRemoteSender::keep(Lock& lock, long used, long sent)
     }
 }
 
-// Writes the log line of an outage, once. The lock is released meanwhile.
+// Logs once that calls are lost. The lock is released meanwhile.
 void SocketRemoteSender::lose(Lock& lock, Loss loss)
 {
     if (m_isLosing) {
@@ -233,7 +233,7 @@ bool SocketRemoteSender::reconnect()
     return outcome == Outcome::Done;
 }
 
-// The working thread.
+// --- The worker thread ------------------------------------------------------------------------------
 
 void SocketRemoteSender::startWork()
 {
@@ -241,18 +241,18 @@ void SocketRemoteSender::startWork()
         return;
     }
     if (m_worker.joinable()) {
-        m_worker.join(); // it has left its last locked section
+        m_worker.join(); // it no longer takes the lock
     }
     try {
         m_worker = std::thread(&SocketRemoteSender::work, this);
         m_isWorking = true;
     } catch (const std::system_error&) {
-        m_socket.close(); // half a frame may be out: whatever followed it would be read in the wrong place
+        m_socket.close(); // a frame may be partly sent: the peer would misread all that follows
         m_waiting.clear();
     }
 }
 
-// Without thread and lock nothing of the waiting frames changes.
+// Afterwards the thread has ended and the waiting frames can be accessed without the lock.
 void SocketRemoteSender::stopWork(Lock& lock)
 {
     if (m_isWorking) {
@@ -297,7 +297,8 @@ void SocketRemoteSender::completeConnection(Lock& lock)
 void SocketRemoteSender::sendNextWaiting(Lock& lock)
 {
     if (!m_socket.isOpen()) {
-        // One new connection a frame, so that a peer that closes each one is not connected to for ever.
+        // Only one new connection per frame, so that a peer that closes every connection is not retried for
+        // ever.
         m_firstSent = 0;
         if (std::exchange(m_firstWasBegunAnew, true) || m_socket.beginConnect(port()) == Outcome::Failed) {
             loseWaiting(lock);
@@ -344,7 +345,7 @@ void SocketRemoteSender::finish(std::chrono::steady_clock::time_point deadline)
     m_socket.close();
 }
 
-// Closing with acknowledgements unread resets the connection, which takes away what has not yet arrived.
+// Closing a socket with unread acknowledgements resets the connection and discards what has not arrived yet.
 void SocketRemoteSender::waitUntilDelivered(std::chrono::steady_clock::time_point deadline)
 {
     while (m_socket.undelivered() > 0 && !m_socket.peerHasClosed()) {

@@ -1,14 +1,3 @@
-// Sends events to the process that listens on the port of a client number, in their order and without ever
-// holding up the caller: a frame that the socket takes goes out in the calling thread, others wait for a
-// thread that works while something waits.
-//
-// A lost connection is begun anew by the next call, so that a process that was started anew is reached again.
-// What cannot be delivered is dropped, frame by frame, with one line in the debug log until calls go through
-// again:
-// - to a process that does not listen, or does not accept within CONNECT_TIMEOUT_MS, all that waits;
-// - to a process that does not read, the oldest of more than MAX_WAITING_FRAMES.
-//
-// Any thread may call; the order of the calls of several is up to them.
 #pragma once
 
 #include "messaging/ptc/ClientSocket.h"
@@ -27,12 +16,22 @@ namespace PTC
 class Event;
 }
 
+// Sends events to the process that listens on the port of a client number, in order and without blocking the
+// caller: a frame that the socket accepts at once is sent in the calling thread; others are queued and sent
+// by a worker thread, which runs only while frames are queued.
+//
+// If the connection is lost, the next call begins a new one, so that a restarted process is reached again.
+// Frames that cannot be delivered are dropped, with one line in the debug log until calls succeed again:
+// - all queued frames, if the process does not listen or does not accept within CONNECT_TIMEOUT_MS;
+// - the oldest of more than MAX_WAITING_FRAMES, if the process does not read.
+//
+// Any thread may call; concurrent calls are sent in any order.
 class SocketRemoteSender : public PTC::RemoteSender
 {
 public:
     static constexpr int CONNECT_TIMEOUT_MS = 2000;
     static constexpr int MAX_WAITING_FRAMES = 256;
-    // What the destructor spends on frames that wait, unless finish was called before.
+    // Time that the destructor waits for queued frames, unless finish was called before.
     static constexpr int FINISH_TIMEOUT_MS = 1000;
 
     // id is the receiver id that every frame of this sender carries.
@@ -41,19 +40,20 @@ public:
     SocketRemoteSender(const SocketRemoteSender&) = delete;
     SocketRemoteSender& operator=(const SocketRemoteSender&) = delete;
 
-    // Waits for the connection, at most the connect timeout. True when it stands. May be called again.
+    // Waits for the connection, at most the connect timeout, and returns whether it is established. May be
+    // called again.
     bool initialize(long identity) override;
-    // 0 on success, -1 otherwise.
+    // Returns 0 on success, -1 otherwise.
     int connectServer();
     bool beginConnect(long identity) override;
-    // Milliseconds that a listener without room is waited for.
+    // Sets how long to wait, in milliseconds, for a listener whose queue is full.
     void setConnectTimeout(int milliseconds);
 
-    // Deletes the event. A payload above 20,424 bytes is dropped.
+    // Deletes the event. Drops payloads of more than 20,424 bytes.
     void send(PTC::Event* event) override;
-    // Whether the connection stands and the peer has not closed it.
+    // Returns whether the connection is established and the peer has not closed it.
     bool isConnected() const override;
-    // The same; a connection that does not stand is begun anew.
+    // As isConnected, but begins a new connection if there is none.
     bool reconnect() override;
     void finish(std::chrono::steady_clock::time_point deadline) override;
 
@@ -75,14 +75,14 @@ private:
     void sendNextWaiting(Lock& lock);
     void waitUntilDelivered(std::chrono::steady_clock::time_point deadline);
 
-    mutable std::mutex m_mutex; // of all that follows
+    mutable std::mutex m_mutex; // guards all members below
     ClientSocket m_socket;
     int m_connectTimeoutMs = CONNECT_TIMEOUT_MS;
     std::array<char, SocketFrame::FRAME_SIZE> m_frame{};
-    std::deque<std::vector<char>> m_waiting; // frames without their zeros at the end
-    long m_firstSent = 0;                    // bytes of the first one that waits
-    bool m_firstWasBegunAnew = false;        // on a second connection
-    bool m_isLosing = false;                 // and the log says so
+    std::deque<std::vector<char>> m_waiting; // without the zero padding
+    long m_firstSent = 0;                    // bytes sent of the first waiting frame
+    bool m_firstWasBegunAnew = false;        // the first waiting frame has had its second connection
+    bool m_isLosing = false;                 // calls are being lost, and this was logged
     bool m_isWorking = false;
     bool m_isAbandoned = false;
     bool m_isFinished = false;

@@ -1,7 +1,7 @@
-// Declares the records of the wire, each from one list of its fields, from which they are also packed, read
-// and shown by name.
+// Declares the records of the wire. Each is declared by one list of its fields, which is also used to pack,
+// read and print it.
 //
-// A list names a record's fields in packing order, each with the form it is packed in and its first value:
+// A list names a record's fields in packing order, each with its packed form and its initial value:
 //     #define tagExample_FIELDS(FIELD) FIELD(Int32, clientId, -1) FIELD(Wide, path) FIELD(SevenInt, rest)
 //     WIRE_RECORD(tagExample);
 // declares a plain struct with the members int clientId = -1, std::wstring path and int rest[7]. Its function
@@ -13,12 +13,12 @@
 
 #include <string>
 
-// How a field is packed. Reading is the same for all forms of a number: a value that cannot be read is zero
-// or empty.
+// The forms in which a field can be packed. All forms of a number are read in the same way; a value that
+// cannot be read is zero or empty.
 namespace WireForms
 {
 
-// The smallest form of the number.
+// A number in its shortest form.
 struct Int {
     using Type = int;
     static constexpr const char* KIND = "int";
@@ -26,7 +26,7 @@ struct Int {
     static void unpack(RecordReader& from, int& value) { value = from.readInt(); }
 };
 
-// Always 4 bytes and a tag.
+// A number in 4 bytes and a tag.
 struct Int32 {
     using Type = int;
     static constexpr const char* KIND = "int32";
@@ -34,7 +34,7 @@ struct Int32 {
     static void unpack(RecordReader& from, int& value) { value = from.readInt(); }
 };
 
-// An id of the framework, which is a long in the program and an Int32 on the wire.
+// An id of the framework: a long in memory, an Int32 on the wire.
 struct Id {
     using Type = long;
     static constexpr const char* KIND = "int32";
@@ -42,7 +42,7 @@ struct Id {
     static void unpack(RecordReader& from, long& value) { value = from.readInt(); }
 };
 
-// Always 8 bytes and a tag.
+// A number in 8 bytes and a tag.
 struct Long {
     using Type = long;
     static constexpr const char* KIND = "long";
@@ -57,7 +57,7 @@ struct Bool {
     static void unpack(RecordReader& from, bool& value) { value = from.readBool(); }
 };
 
-// A bool as the number 0 or 1.
+// A bool, packed as the number 0 or 1.
 struct Flag {
     using Type = bool;
     static constexpr const char* KIND = "bool as int";
@@ -75,7 +75,7 @@ struct Wide {
     static void unpack(RecordReader& from, Type& text) { text = from.readWide(); }
 };
 
-// Values of one form, one after the other.
+// An array of values of one form.
 template <typename Form, int COUNT>
 struct Several {
     using Type = typename Form::Type[COUNT];

@@ -1,11 +1,11 @@
-// Signals of the process in the threads that serve its sockets.
 #pragma once
 
+// Sets the signal mask of the threads that serve sockets.
 namespace WorkerSignals
 {
 
-// Blocks every signal but faults in the calling thread: termination requests are for the main thread, and
-// here they would only cut system calls short.
+// Blocks every signal except faults in the calling thread: termination requests are handled in the main
+// thread and would only interrupt system calls here.
 void leaveToMainThread();
 
 } // namespace WorkerSignals

@@ -1,20 +1,20 @@
-// Types of the touch lock announcements that the appliance's processes exchange.
 #pragma once
 
 #include "messaging/ptc/WireRecord.h"
 
 #include <QMetaType>
 
+// Types of the touch lock announcements that the appliance's processes exchange.
 namespace APPEventDefine
 {
 
 enum LOCKTYPE : int {
     LOCKTYPE_NONE = 0,
-    LOCKTYPE_TOUCH = 1,  // this process holds the touch lock
+    LOCKTYPE_TOUCH = 1,  // the sending process holds the touch lock
     LOCKTYPE_OBJECT = 2, // a transient control or a remembered object is in use
 };
 
-// Who sent an event; 3 is this program, which ignores its own echo.
+// Identifies the sender of an event. The titler ignores events from itself.
 enum EventRevicer : int { EVENTREVICER_NONE = 0, EVENTREVICER_TITLER = 3, EVENTREVICER_RESTORE_ALL = 4 };
 
 // clang-format off

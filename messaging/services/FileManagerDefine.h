@@ -1,10 +1,11 @@
-// Types of the file manager service, which is told of changes to titles and tells of changes to files.
 #pragma once
 
 #include "messaging/ptc/WireRecord.h"
 
 #include <QMetaType>
 
+// Types of the file manager service, to which changes to titles are reported and which reports changes to
+// files.
 namespace FileManagerDefine
 {
 
@@ -15,7 +16,7 @@ enum emTITLECHANGE_TYPE : int {
     TITLE_TEMPLATE_ADDED = 5,
 };
 
-// File types that this program looks at in notices; all others are of no interest to it.
+// The file types that this program handles in notifications; all others are ignored.
 enum emFILE_TYPE : int { FILE_TYPE_FONT = 6, FILE_TYPE_TITLER_TEMPLATE = 8 };
 
 // clang-format off
@@ -56,7 +57,7 @@ enum emFILE_TYPE : int { FILE_TYPE_FONT = 6, FILE_TYPE_TITLER_TEMPLATE = 8 };
     FIELD(Bool, thirteenth, false) \
     FIELD(SevenInt, last)
 
-// result is 0 when the file was deleted.
+// result is 0 if the file was deleted.
 #define tagDeleteNotify_FIELDS(FIELD) \
     FIELD(Int, first, 0) \
     FIELD(Int, fileType, 0) \

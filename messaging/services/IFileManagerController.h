@@ -1,4 +1,4 @@
-// The service that is told of changes to titles, and reports changes to files and folders.
+// The service that receives changes to titles and reports changes to files and folders.
 #pragma once
 
 #include "messaging/services/FileManagerDefine.h"

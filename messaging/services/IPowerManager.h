@@ -1,4 +1,4 @@
-// The service that reports when the appliance goes down or comes up.
+// The service that reports that the appliance starts or shuts down.
 #pragma once
 
 #include "messaging/services/ServiceInterface.h"

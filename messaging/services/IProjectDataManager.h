@@ -1,4 +1,4 @@
-// The service that reports when a project is loaded.
+// The service that reports that a project was loaded.
 #pragma once
 
 #include "messaging/services/ServiceInterface.h"

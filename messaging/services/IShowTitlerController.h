@@ -1,4 +1,4 @@
-// The service through which the sub panel process asks for the titler.
+// The service with which the sub panel process opens the titler.
 #pragma once
 
 #include "messaging/services/ServiceInterface.h"

@@ -1,4 +1,4 @@
-// The service that shows the soft keyboard and sends what is typed on it.
+// The service that shows the soft keyboard and sends its key events.
 #pragma once
 
 #include "messaging/services/ServiceInterface.h"

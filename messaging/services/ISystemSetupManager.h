@@ -1,4 +1,4 @@
-// The service that knows the appliance's languages and model.
+// The service that provides the appliance's languages and model.
 #pragma once
 
 #include "messaging/services/ServiceInterface.h"

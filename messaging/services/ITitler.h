@@ -1,7 +1,7 @@
-// The service that this program offers to its siblings.
+// The service that this program offers to its sibling processes.
 //
-// registerCallBack sends results there from now on; the implementation takes the callback over. The data of a
-// result is valid during the call only.
+// registerCallBack sets the callback that receives all further results; the implementation takes ownership of
+// it. The data of a result is valid only during the call.
 #pragma once
 
 #include "messaging/services/ServiceInterface.h"

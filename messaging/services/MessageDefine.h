@@ -1,4 +1,3 @@
-// Types of the message service, which shows the numbered message boxes of the appliance.
 #pragma once
 
 #include "messaging/ptc/WireRecord.h"
@@ -8,7 +7,7 @@
 namespace MessageDef
 {
 
-// Numbers of the messages that this program posts; their texts live in the message service.
+// Numbers of the messages that this program posts; the message service has the texts.
 enum Message_ID : int {
     MESSAGE_DELETE_TEMPLATE = 43,
     MESSAGE_RENAME_FAILED = 47,
@@ -28,15 +27,16 @@ enum Message_ID : int {
 
 } // namespace MessageDef
 
+// Types of the message service, which shows the numbered message boxes of the appliance.
 namespace MessageDefine
 {
 
 using _emBoxType = int;
 
-// Which button ended a box. Boxes with one button answer with CLOSE_CANCEL.
+// The button that closed a box. Boxes with one button answer with CLOSE_CANCEL.
 enum _emCloseType : int { CLOSE_CANCEL = 1, CLOSE_OK = 2 };
 
-// Who is in front of the operator.
+// The window in front of the operator.
 enum _emTopWindow : int { TOP_WINDOW_TITLER = 1, TOP_WINDOW_MAIN = 2 };
 
 // clang-format off

@@ -1,5 +1,3 @@
-// Packs and reads the parameters of calls: records by the lists of their fields, single values in the form of
-// their type.
 #pragma once
 
 #include "messaging/ptc/CSimpleBuffer.h"
@@ -9,6 +7,7 @@
 
 #include <string>
 
+// Packs and reads the parameters of calls: records by their field lists, single values by their type.
 namespace RecordPacking
 {
 
@@ -56,7 +55,7 @@ simplebuffer serialize(const Parameter& parameter)
     return buffer;
 }
 
-// Reads at most size bytes. Leaves zero values where the data ends or cannot be read.
+// Reads at most size bytes. Fields that are missing or cannot be read are zero or empty.
 template <typename Parameter>
 void deserialize(Parameter& parameter, void* data, long size)
 {

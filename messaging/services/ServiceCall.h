@@ -1,4 +1,3 @@
-// A call on its way: what the proxies do with a parameter, and what the adapters do with a message.
 #pragma once
 
 #include "messaging/ptc/Event.h"
@@ -13,13 +12,14 @@ class CallbackProxy;
 class Proxy;
 } // namespace PTC
 
+// Sends and delivers calls: what the proxies do with a parameter, and what the adapters do with a message.
 namespace ServiceCall
 {
 
-// What a row of a service's table means, by the type of its parameter.
+// The meaning of a row of a service's table, derived from the type of its parameter.
 enum class Kind { Call, RegisterCallBack, RegisterNotify };
 
-// The parameter as it travels. Of a registration only ids do.
+// Defines the type that is packed for a parameter. A registration is sent as a record of ids.
 template <typename Parameter>
 struct Packed {
     using Type = Parameter;
@@ -39,16 +39,17 @@ struct Packed<NotifyTarget<Notify>> {
 // Sends a call with packed parameters and destroys the buffer.
 void invoke(PTC::Proxy& proxy, long methodId, simplebuffer parameters);
 void invoke(PTC::CallbackProxy& proxy, long methodId, simplebuffer parameters);
-// Sends a call without parameters. It carries 4 zero bytes, because a frame without a payload is not
+// Sends a call without parameters. Its payload is 4 zero bytes, because a frame without a payload is not
 // dispatched.
 void invoke(PTC::Proxy& proxy, long methodId);
 void invoke(PTC::CallbackProxy& proxy, long methodId);
 
-// Makes an adapter for target, a pointer to the interface of that adapter type, and tells the service of it.
+// Both create an adapter for target, which points to the interface of that adapter type, and send its id to
+// the service.
 void registerCallBack(PTC::Proxy& proxy, long methodId, long adapterType, void* target);
 void registerNotify(PTC::Proxy& proxy, long methodId, long adapterType, void* target, int clientId);
 
-// Sends the call of a row without a parameter, or packs the parameter, or registers it.
+// Sends the call of a row: without a parameter, with a packed parameter, or as a registration.
 template <typename AnyProxy>
 void send(AnyProxy& proxy, long methodId)
 {
@@ -67,8 +68,8 @@ void send(AnyProxy& proxy, long methodId, const Parameter& parameter)
     }
 }
 
-// Reads the parameter of a row from a message and calls the target with it. Registrations are left to the
-// adapter of the service.
+// Reads the parameter of a row from a message and calls the target with it. Does nothing for registrations,
+// which the adapter of the service handles.
 template <typename Interface>
 void deliver(const PTC::Event&, Interface& target, void (Interface::*method)())
 {

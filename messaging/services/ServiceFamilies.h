@@ -1,5 +1,3 @@
-// The proxies and adapters of all services that this program calls or offers, and the making of them by the
-// numbers of the service table.
 #pragma once
 
 #include "messaging/services/IAPPEventFilter.h"
@@ -21,21 +19,24 @@ SERVICE_FAMILY_WITH_EVENTS(ProjectDataManager);
 SERVICE_FAMILY(ShowTitlerController);
 SERVICE_FAMILY(SoftKeyBoardController);
 SERVICE_FAMILY_WITH_EVENTS(SystemSetupManager);
-SERVICE_CALL_FAMILY(Titler); // see TitlerAdapter and TitlerParams too
+SERVICE_CALL_FAMILY(Titler); // see also TitlerAdapter and TitlerParams
 
+// Declares the proxies and adapters of all services that this program calls or offers, and creates them by
+// the numbers of the service table.
 namespace ServiceFamilies
 {
 
-// Returns a new proxy, owned by the caller, without sender, receiver and factory. Its interface pointer is
-// written to instance as void*. Null, with instance untouched, for services without a family here.
+// Creates a proxy, owned by the caller, without sender, receiver and factory, and stores its interface
+// pointer in instance as void*. Returns null and leaves instance unchanged for services that are not declared
+// here.
 PTC::Proxy* createProxy(long interfaceId, void** instance);
 
-// Returns a new callback or notify adapter of that type, owned by the caller, without a target. Null for
-// types that no client of the services here has.
+// Creates a callback or notify adapter of that type, owned by the caller, without a target. Returns null if
+// no service declared here has that adapter type.
 PTC::IAdapterBase* createAdapter(long adapterType, long id);
 
-// Returns a new proxy, owned by the caller, with which a service calls the adapter of a client, of that type
-// and with that id. Null for types that no client of the services here has.
+// Creates a proxy, owned by the caller, with which a service calls the client's adapter of that type and id.
+// Returns null if no service declared here has that adapter type.
 PTC::CallbackProxy* createClientProxy(long adapterType, long id);
 
 } // namespace ServiceFamilies

@@ -1,11 +1,11 @@
-// The proxies and adapters of a service, made from its table.
+// Defines the proxies and adapters of a service from its table.
 //
 //     SERVICE_FAMILY(Example)             for a service with answers
-//     SERVICE_FAMILY_WITH_EVENTS(Example) for one that has events too
-// define, for the client's side, ExampleRemoteProxy, which sends the calls, and ExampleCallBackAdapter and
-// ExampleNotifyAdapter, which take answers and events off the wire; for the service's side
-// ExampleCallBackRemoteProxy and ExampleNotifyRemoteProxy, which send those; and ExampleParams with a
-// serialize_method_param and a deserialize_method_param of each row, for whoever looks into a message.
+//     SERVICE_FAMILY_WITH_EVENTS(Example) for one that also has events
+// define for the client ExampleRemoteProxy, which sends the calls, and ExampleCallBackAdapter and
+// ExampleNotifyAdapter, which receive answers and events; for the service ExampleCallBackRemoteProxy and
+// ExampleNotifyRemoteProxy, which send them; and ExampleParams with a serialize_method_param and a
+// deserialize_method_param for each row, for code that reads or writes single messages.
 #pragma once
 
 #include "messaging/ptc/CallbackAdapter.h"

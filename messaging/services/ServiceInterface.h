@@ -1,30 +1,30 @@
-// Declares the interfaces of a service from its table. A table is one header with three lists of rows, each
+// Declares the interfaces of a service from its table. A table is a header with three lists of rows, each
 //     ROW(id, name)  or  ROW(id, name, type of the parameter, name of the parameter)
-// with the id of the method on the wire: in Example_CALLS what clients call, in Example_ANSWERS the answers
-// to a client, in Example_EVENTS what the service reports to clients. Below the lists
-//     SERVICE(Example, interface id, client number of its process, operations that the service has,
+// where id is the id of the method on the wire. Example_CALLS lists the calls of clients, Example_ANSWERS the
+// answers to a client, Example_EVENTS what the service reports to clients. Below the lists
+//     SERVICE(Example, interface id, client number of its process, number of its operations,
 //             type of the callback adapter, type of the notify adapter);
 //     SERVICE_ANSWERS(Example);
 //     SERVICE_EVENTS(Example);
-// declare IExample, IExampleCallBack and IExampleNotify. messaging/services/ServiceFamilies.h makes the
+// declare IExample, IExampleCallBack and IExampleNotify. messaging/services/ServiceFamilies.h declares the
 // proxies and adapters of both sides from the same lists.
 //
-// Calls are one-way and run in the caller's thread; answers and events arrive as calls in the GUI thread.
-// A parameter that is a pointer to a callback interface, or a NotifyTarget, registers it; the target stays
-// the caller's. Each interface lists its rows at run time too: forEachMethod(visit) calls visit(id, name,
-// pointer to the member function, name of the parameter or "").
+// Calls are one-way and run in the caller's thread; answers and events arrive as calls in the GUI thread. A
+// parameter that is a pointer to a callback interface, or a NotifyTarget, is a registration; the caller keeps
+// ownership of the target. The rows of an interface are also available at run time: forEachMethod(visit)
+// calls visit(id, name, pointer to the member function, name of the parameter or "").
 #pragma once
 
 #include "messaging/services/ServiceTable.h"
 
-// Whom to call for the events, and the client id that the service gave.
+// The object that receives the events, and the client id that the service has assigned.
 template <typename Notify>
 struct NotifyTarget {
     Notify* target = nullptr;
     int clientId = -1;
 };
 
-#ifndef Q_MOC_RUN // which does not know __VA_OPT__, and needs none of these classes
+#ifndef Q_MOC_RUN // moc does not support __VA_OPT__ and needs none of these classes
 // clang-format off
 #define SERVICE(Service, id, client, operations, callBackAdapter, notifyAdapter) \
     class I##Service \
@@ -36,7 +36,7 @@ struct NotifyTarget {
         static constexpr int OPERATIONS = operations; \
         static constexpr long CALLBACK_ADAPTER_TYPE = callBackAdapter; \
         static constexpr long NOTIFY_ADAPTER_TYPE = notifyAdapter; \
-        /* False when the process of the service is known to be gone: what is sent to it now is lost. */ \
+        /* Returns false if the service's process is known not to be running, so calls would be lost. */ \
         virtual bool isReachable() const { return true; } \
         SERVICE_INTERFACE_METHODS(I##Service, Service##_CALLS) \
     }

@@ -18,7 +18,7 @@ namespace ServiceTable
 namespace
 {
 
-// By client number, from MAIN_CLIENT on.
+// The sender key of each client number, beginning with MAIN_CLIENT.
 constexpr std::array<long, 9> SENDER_KEYS = {1, 2, 3, 4, 5, 6, 4, 7, 8};
 
 template <typename Interface>
@@ -33,8 +33,7 @@ constexpr Service describe()
             Interface::NOTIFY_ADAPTER_TYPE};
 }
 
-// The services that this program calls are described by their own tables.
-// clang-format off
+// The services that this program calls are taken from their own tables.
 constexpr std::array SERVICES = {
     describe<IAPPEventFilter>(),
     Service{4, "AudioAccessController", MAIN_CLIENT_KEY, MAIN_CLIENT, 27, 5, 6},

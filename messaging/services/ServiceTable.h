@@ -1,8 +1,8 @@
-// Every service of the appliance: where it lives and by which numbers it is addressed.
 #pragma once
 
 #include <span>
 
+// Lists every service of the appliance with its process and its numbers.
 namespace ServiceTable
 {
 
@@ -23,20 +23,21 @@ struct Service {
     const char* name;
     long clientKey;
     long port;
-    int methods;          // operations of the interface
-    long callBackAdapter; // adapter types, NO_ADAPTER for none
+    int methods;          // number of operations of the interface
+    long callBackAdapter; // adapter types; NO_ADAPTER if there is none
     long notifyAdapter;
 };
 
-// All services in the order of their interface ids.
+// Returns all services in the order of their interface ids.
 std::span<const Service> services();
-// Null for an id that is not in the table.
+// Returns null for an id that is not in the table.
 const Service* findByInterface(long interfaceId);
-// The service that has the callback or notify adapter type; null for an unknown type.
+// Returns the service that has this callback or notify adapter type, or null for an unknown type.
 const Service* findByAdapter(long adapterType);
-// Key of the sender to a process by its client number; that of this process for an unknown one.
+// Returns the key of the sender to the process with that client number; the key of this process for an
+// unknown number.
 long senderKeyOf(long client);
-// Whether another process of the appliance has that client number.
+// Returns whether another process of the appliance has that client number.
 bool isSibling(long client);
 
 } // namespace ServiceTable

@@ -1,8 +1,8 @@
-// Types of the sub panel process: the folder status and the soft keyboard.
 #pragma once
 
 #include "messaging/ptc/WireRecord.h"
 
+// Types of the sub panel process: the folder status and the soft keyboard.
 namespace SubCommonDefine
 {
 
@@ -12,8 +12,8 @@ namespace SubCommonDefine
     FIELD(Int, type, 0) \
     FIELD(Wide, path)
 
-// Describes a text field to the soft keyboard. fieldKind is 1 for a line edit, limitCondition the pattern of
-// the field's validator.
+// Describes a text field to the soft keyboard. fieldKind is 1 for a line edit; limitCondition is the pattern
+// of the field's validator.
 #define tagSoftKeyBoardInitData_FIELDS(FIELD) \
     FIELD(Int32, fieldKind, 0) \
     FIELD(Wide, title) \
@@ -36,14 +36,14 @@ namespace SubCommonDefine
     FIELD(Flag, autoRepeat, false) \
     FIELD(Int32, nativeVirtualKey, 0)
 
-// Mode 0 puts the cursor at current, 1 selects begin to end, 2 selects all.
+// mode 0 puts the cursor at current, 1 selects from begin to end, 2 selects all.
 #define tagSoftKeyBoardKeyTextSelectionPos_FIELDS(FIELD) \
     FIELD(Int32, begin, 0) \
     FIELD(Int32, end, 0) \
     FIELD(Int32, current, 0) \
     FIELD(Int32, mode, 0)
 
-// Why an input is refused.
+// The reason why an input is refused.
 #define taLimitInfo_FIELDS(FIELD) \
     FIELD(Wide, text) \
     FIELD(Wide, secondText) \

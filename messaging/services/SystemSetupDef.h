@@ -1,22 +1,23 @@
-// Types of the system set-up service: languages and model of the appliance.
 #pragma once
 
 #include "messaging/ptc/WireRecord.h"
 
 #include <QMetaType>
 
+// Types of the system set-up service: languages and model of the appliance.
 namespace SystemSetupDef
 {
 
-// Language of the whole appliance. Values beyond these belong to the appliance and mean English here.
+// Language of the whole appliance. All other values are languages that this program does not have; it uses
+// English for them.
 enum emSystemLanguageType : int {
     emSystemLanguageUnknown = 0,
     emSystemLanguageEnglish = 1,
     emSystemLanguageChinese = 2,
 };
 
-// Language of the soft keyboard. The names tell the script that the font tables pair with the number;
-// every other value selects the Latin-only row.
+// Language of the soft keyboard. The names state the script that the font tables use for the number; all
+// other values select the fonts for Latin only.
 enum emInputLanguageType : int {
     emInputLanguageUnknown = 0,
     emInputLanguageJapanese = 7,
@@ -25,7 +26,7 @@ enum emInputLanguageType : int {
     emInputLanguageChineseMixed = 10,
 };
 
-// Model of the appliance; 1 is the model sold in China, whose only family is FAMILY_FOR_CN_MODULE.
+// Model of the appliance. Model 1 is sold in China and has a single font family, FAMILY_FOR_CN_MODULE.
 enum emInformationModel : int {
     emInformationModelDefault = 0,
     emInformationModelChina = 1,

@@ -1,9 +1,9 @@
-// Takes the calls of an interface off the wire and makes them to a target, in the receiver's thread. Base is
-// PTC::Adapter for a service and PTC::CallbackAdapter for what clients register.
 #pragma once
 
 #include "messaging/services/ServiceCall.h"
 
+// Unpacks the calls of an interface and makes them to a target, in the receiver's thread. Base is
+// PTC::Adapter for a service and PTC::CallbackAdapter for callbacks that clients register.
 template <typename Interface, typename Base>
 class TargetAdapter : public Base
 {
@@ -13,7 +13,7 @@ public:
     // target is an Interface*; not owned.
     void setTarget(void* target) override { m_target = static_cast<Interface*>(target); }
 
-    // Does nothing without a target.
+    // Does nothing if no target is set.
     void receive(PTC::Event* event) override
     {
         if (m_target == nullptr) {

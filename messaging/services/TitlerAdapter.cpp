@@ -36,8 +36,8 @@ void TitlerAdapter::receiveRegisterCallBack(PTC::Event* event)
         createProxy(CALLBACK_INTERFACE_ID, info.adapterId, info.receiverIdentity));
     auto* callBack = dynamic_cast<ITitlerCallBack*>(proxy.get());
     if (callBack == nullptr) {
-        return; // whoever registered before keeps the result
+        return; // the previous registration stays in effect
     }
-    static_cast<void>(proxy.release()); // the target's from here on
+    static_cast<void>(proxy.release()); // the target owns it now
     target()->registerCallBack(callBack);
 }

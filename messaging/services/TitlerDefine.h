@@ -1,9 +1,9 @@
-// Records of the service that this program offers and of its callback, and of all registrations.
+// Records of the service that this program offers, of its callback, and of all registrations.
 #pragma once
 
 #include "messaging/ptc/WireRecord.h"
 
-// Who asked; stored and echoed, its values belong to the callers.
+// Identifies the caller. The value is stored and returned unchanged; its meaning belongs to the callers.
 using _CALL_TITLER_TYPE = int;
 
 // clang-format off
@@ -26,9 +26,9 @@ WIRE_RECORD(_SHOW_TITLER_PARAMTER);
 WIRE_RECORD(_tagCallBackInfo);
 WIRE_RECORD(_tagNotifyInfo);
 
-// The result of a create session. On the wire: type (int), path (wide), data (raw of size bytes), size (int),
-// count (int). data is itself packed: the paths of the titles made, see TitlerParams::packPaths. The sender
-// owns it.
+// The result of a create session. On the wire: type (int), path (wide), data (raw, size bytes), size (int),
+// count (int). data contains the packed paths of the titles that were made, see TitlerParams::packPaths, and
+// is owned by the sender.
 struct _CALLBACK_TITLER_PARAMTER {
     _CALL_TITLER_TYPE type = 0;
     std::wstring path;

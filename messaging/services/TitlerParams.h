@@ -1,4 +1,3 @@
-// The parameters of ITitler and ITitlerCallBack, and the list of titles in a result.
 #pragma once
 
 #include "messaging/services/ServiceFamilies.h"
@@ -6,12 +5,14 @@
 #include <string>
 #include <vector>
 
+// The parameters of ITitler and ITitlerCallBack, and the list of titles in a result.
 struct TitlerParams : TitlerAnswerParams {
     static constexpr std::size_t MOST_PATHS = 65535;
 
-    // Returns a new buffer with the first MOST_PATHS paths, one wide after the other. The caller destroys it.
+    // Returns a new buffer with the first MOST_PATHS paths, each packed as a wide string. The caller destroys
+    // it.
     static simplebuffer packPaths(const std::vector<std::wstring>& paths);
-    // Returns the paths in a result's data; no more than the data holds, whatever the result's count says. A
-    // result that was read points into its message, with a size that is no more than the message holds.
+    // Returns the paths in a result's data; reads no more than the data contains, whatever the result's count
+    // is. The data of a received result points into its message.
     static std::vector<std::wstring> unpackPaths(const _CALLBACK_TITLER_PARAMTER& result);
 };

@@ -25,7 +25,7 @@ std::mutex& stateMutex()
     return mutex;
 }
 
-// openlog keeps the pointer it is given, so the tag lives here.
+// openlog stores the pointer, so the tag is kept here.
 std::string& logTag()
 {
     static std::string tag;
@@ -86,7 +86,7 @@ std::string programPrefix()
     return parentOf(parentOf(path));
 }
 
-// The part of a zone file's path that is the zone's name, or empty.
+// Returns the zone name in the path of a zone file, or an empty string.
 std::string zoneNameOfFile(const std::string& path)
 {
     const std::string marker = "zoneinfo/";
@@ -121,7 +121,7 @@ std::string zoneName()
     return zone;
 }
 
-// The first use of backtrace loads a library, which must not happen inside a signal handler.
+// The first call of backtrace loads a library, which must not happen in a signal handler.
 __attribute__((constructor)) void prepareBacktrace()
 {
     void* frames[1];

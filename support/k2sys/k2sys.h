@@ -17,12 +17,12 @@ extern "C" {
 
 #define K2SYS_API __attribute__((visibility("default")))
 
-/* Starts the library; may be called more than once. 0 on success. */
+/* Starts the library; may be called more than once. Returns 0 on success. */
 K2SYS_API int k2sys_init(void);
-/* Counterpart of k2sys_init; ends the connection to the system log. */
+/* Counterpart of k2sys_init; closes the connection to the system log. */
 K2SYS_API void k2sys_exit(void);
 
-/* As openlog, syslog and vsyslog of the C library. The tag is copied. */
+/* Same as openlog, syslog and vsyslog of the C library, but the tag is copied. */
 K2SYS_API void k2sys_openlog(const char* tag, int option, int facility);
 K2SYS_API void k2sys_syslog(int priority, const char* format, ...) __attribute__((format(printf, 2, 3)));
 K2SYS_API void k2sys_vsyslog(int priority, const char* format, va_list args)
@@ -32,37 +32,37 @@ K2SYS_API void k2sys_vsyslog(int priority, const char* format, va_list args)
 K2SYS_API void k2sys_print_backtrace(void);
 
 /*
- * Paths. Each writes a NUL-terminated path into a buffer of size bytes and returns a state above 0, or a
- * negative value, with an empty string where there is room for one, when the path does not fit.
+ * Each of these writes a NUL-terminated path into a buffer of size bytes and returns a state above 0. If the
+ * path does not fit it returns a negative value and, unless size is 0, writes an empty string.
  *
- * root: K2SYS_AC_ROOT, else empty. 1 when it is exactly "/", else 2.
- * data: K2SYS_AC_DATA, else $XDG_DATA_HOME/titler, else $HOME/.local/share/titler; as it stands
- * there, also when it is relative. 1.
- * prefix: K2SYS_AC_PREFIX, else the parent of the folder that the program was started from. 1.
+ * root: K2SYS_AC_ROOT, else empty. Returns 1 if it is exactly "/", else 2.
+ * data: K2SYS_AC_DATA, else $XDG_DATA_HOME/titler, else $HOME/.local/share/titler, even if
+ * that is relative. Returns 1.
+ * prefix: K2SYS_AC_PREFIX, else the parent of the folder that the program was started from. Returns 1.
  */
 K2SYS_API int k2sys_getenv_ac_root(char* buffer, size_t size);
 K2SYS_API int k2sys_getenv_ac_data(char* buffer, size_t size);
 K2SYS_API int k2sys_getenv_ac_prefix(char* buffer, size_t size);
 
-/* Current local time. 1 on success, negative otherwise. */
+/* Gets the current local time. Returns 1 on success, a negative value otherwise. */
 K2SYS_API int k2sys_get_time(struct tm* now);
 
-/* Bytes of the file system that holds path: all of it, and what an ordinary user may still use. -1 on error.
- * K2SYS_FS_REMAIN, when it is set to a number, is what k2sys_fs_remain reports. */
+/* Return the total size in bytes of the file system that holds path, and the bytes that an ordinary user can
+ * still use; -1 on error. If K2SYS_FS_REMAIN is set to a number, k2sys_fs_remain returns that. */
 K2SYS_API long long k2sys_fs_size(const char* path);
 K2SYS_API long long k2sys_fs_remain(const char* path);
 
-/* Zone name, such as a region, "/", a city. 1 on success, 0 when the machine has no named zone or it does not
- * fit. */
+/* Gets the name of the time zone, usually region, "/" and city. Returns 1 on success, 0 if the machine has no
+ * named zone or the name does not fit. */
 K2SYS_API int k2sys_get_current_timezone(char* buffer, size_t size);
 
 /*
- * What this program asks beyond the library's interface. These are linked into the program (target
- * titler_support), so that it also runs on the appliance's library.
+ * Functions that this program needs beyond the library's interface. They are linked into the program (target
+ * titler_support), so that it also runs with the appliance's library.
  *
- * log_dir: K2SYS_LOG_DIR, else "/var/log"; returns as the paths above.
+ * log_dir: K2SYS_LOG_DIR, else "/var/log"; same result values as above.
  * port_offset: K2SYS_PORT_OFFSET, else 0. Added to a TCP port at bind and connect; values outside -1000 to
- * 60000 read as 0.
+ * 60000 count as 0.
  */
 int k2sys_log_dir(char* buffer, size_t size);
 int k2sys_port_offset(void);

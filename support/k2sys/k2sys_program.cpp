@@ -1,4 +1,4 @@
-// The part of k2sys.h that belongs to the program and not to the platform library.
+// The functions of k2sys.h that are part of the program, not of the platform library.
 #include "support/k2sys/k2sys.h"
 
 #include <cstdlib>
