@@ -5,20 +5,20 @@
 
 class TText;
 
-// Hears from the units of a text object what the scene and the panel have to know. Records are valid during
-// the call only. GUI thread only.
+// Receives from the units of a text object what the scene and the panel need to know. Records are valid
+// during the call only. GUI thread only.
 class ITextObjectListener
 {
 public:
     virtual ~ITextObjectListener() = default;
 
-    // A change that is a step of undo: old and new record, old and new last style.
+    // A change that becomes an undo step: old and new record, old and new last style.
     virtual void contentsEdited(TText& before, TText& after, TText& lastBefore, TText& lastAfter) = 0;
     // The object was moved; scene coordinates.
     virtual void objectMoved(QPointF from, QPointF to) = 0;
     // The style at the cursor or of the selection.
     virtual void styleShown(TText& style) = 0;
-    // Whether shadow and align, and whether the move buttons apply.
+    // Whether shadow and align, and whether the move buttons are available.
     virtual void selectionModeChanged(bool shadowAndAlign, bool move) = 0;
     // The object is selected and no longer edited.
     virtual void objectSelected() = 0;
@@ -28,8 +28,8 @@ public:
     virtual void textTyped() = 0;
     // A finger came down on the object.
     virtual void objectPressed() = 0;
-    // The object is about to be edited and needs the input language of the scene.
+    // Called before the object is edited. It needs the scene's input language then.
     virtual void editingBegins() = 0;
-    // True opens the soft keyboard for the object or brings it up to date, false closes it.
+    // True opens the soft keyboard for the object or updates it, false closes it.
     virtual void keyboardWanted(bool wanted) = 0;
 };
