@@ -149,8 +149,8 @@ bool CanvasScene::archiveIsNull(const Archive* archive)
 void CanvasScene::slotUpdateArchive(const Archive* archive)
 {
     endPreview();
-    const auto previous = m_currentPixmapItem ? m_currentPixmapItem->source()
-                                              : nullptr; // kept so that a pasted title can share it
+    // Kept so that a pasted title can share it.
+    const auto previous = m_currentPixmapItem ? m_currentPixmapItem->source() : nullptr;
     savePreviousArchiveInfo();
     // The pictures do not show yet what was typed last.
     const Archive* before = m_title->archive();

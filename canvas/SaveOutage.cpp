@@ -46,8 +46,8 @@ void reportPictures(const std::vector<RefusedWrites::File>& written)
 
 SaveOutage* SaveOutage::instance()
 {
-    static SaveOutage* const outage =
-        new SaveOutage; // never destroyed, since threads may report to it until the process ends
+    // Never destroyed, since threads may report to it until the process ends.
+    static SaveOutage* const outage = new SaveOutage;
     return outage;
 }
 

@@ -473,8 +473,8 @@ void TouchTextEditor::mouseDoubleClick(QGraphicsSceneMouseEvent* event)
     m_state.keyboardAsked = false;
     m_surface.setWritable(true);
     m_surface.handleByTextItem(QEvent::GraphicsSceneMouseDoubleClick, *event);
-    m_state.gesture =
-        Gesture::DoubleTap; // set after Qt has handled the event, which may have called the press
+    // Set after Qt has handled the event, which may have called the press.
+    m_state.gesture = Gesture::DoubleTap;
     m_styleEditor.selectWholeText();
     m_state.doubleClickedSelection = true;
     m_surface.setWritable(true);

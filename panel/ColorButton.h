@@ -5,7 +5,7 @@
 #include <QColor>
 #include <QString>
 
-// A touch button whose face is a colour: it is painted from its style sheet, darker while it is pressed and
+// A touch button that shows a colour: it is painted from its style sheet, darker while it is pressed and
 // faint while it is disabled.
 class ColorButton : public KSPushbutton
 {

@@ -110,7 +110,7 @@ void EdgeToolBox::edgeWidthChangedForPreview(int value)
     Q_EMIT edgeChange(1, m_edge, TextObjectConstants::PropertyEdgeWidthPreview, PREVIEW, WIDTH);
 }
 
-// The whole drag is one step of undo.
+// Turns the whole drag into one undo step.
 void EdgeToolBox::edgeWidthChangedForSave()
 {
     Q_EMIT signalShowEdgeSlider(false);
