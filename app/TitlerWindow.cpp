@@ -437,8 +437,8 @@ void TitlerWindow::closeTitlerMainWindow()
     EditContextController::getInstance()->sentITitlerCallBack(path.toStdWString());
     EditContextController::getInstance()->setITitlerNoCallBack();
     mLinks->changeTopWindow(MessageDefine::TOP_WINDOW_MAIN);
-    // All files are renamed into place. Nobody waits until the disk has synced them, so what is missing later
-    // is only logged.
+    // All files are renamed into place. Nobody waits for the disk to sync them; those that are not synced
+    // after the deadline are only logged.
     QTimer::singleShot(SYNC_DEADLINE, this, &UnsavedWork::logUnsynced);
 }
 

@@ -193,7 +193,7 @@ private:
 
     static bool WINDOW_IS_SHOWN;
 
-    // Owned by Qt parents.
+    // Owned by their Qt parents.
     ToolsBar* mToolsBar = nullptr;
     CanvasScene* mCanvasScene = nullptr;
     GraphicsView* mGraphicsView = nullptr;

@@ -8,8 +8,8 @@
 #include <string>
 #include <vector>
 
-// Makes the titles for the benchmarks: four texts with one style per character, which change in look along
-// the text; the first text has an outline and the second a shadow.
+// Makes the titles for the benchmarks: four texts with one style per character, whose look changes along the
+// text; the first text has an outline and the second a shadow.
 class BenchTitles
 {
 public:

@@ -29,7 +29,7 @@ bool isSameFile(const struct stat& a, const struct stat& b)
            a.st_mtim.tv_sec == b.st_mtim.tv_sec && a.st_mtim.tv_nsec == b.st_mtim.tv_nsec;
 }
 
-// Comparing is fifty times faster than decoding.
+// Compares the bytes of two files, which is fifty times faster than decoding one.
 bool haveSameBytes(const QString& one, const QString& other)
 {
     QFile a(one);

@@ -11,7 +11,8 @@
 class BackgroundPicture
 {
 public:
-    // Never null; a file that cannot be read gives an empty pixmap. GUI thread only.
+    // Loads the picture. Never returns null; a file that cannot be read gives an empty pixmap. GUI thread
+    // only.
     static std::shared_ptr<const BackgroundPicture> load(const QString& path);
     // Loads a picture in two steps. The first one, read(), takes long and may run in any thread.
     struct Decoded {
@@ -32,7 +33,7 @@ public:
 
 private:
     explicit BackgroundPicture(const Decoded& decoded);
-    // Returns whether this picture has the contents of the file with this status.
+    // Returns whether the file at path, which has this status, contains this picture.
     bool isThatOf(const QString& path, const struct stat& status) const;
 
     QString m_path;

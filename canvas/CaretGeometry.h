@@ -40,7 +40,7 @@ private:
     double bottomOf(const QTextBlock& block, const QTextLine& line) const;
 
     const QTextDocument& m_document;
-    // Sum of the heights of the blocks before each block.
+    // For each block the sum of the heights of the blocks before it.
     std::vector<double> m_heightsAbove;
     double m_documentHeight = 0.0;
     bool m_valid = false;

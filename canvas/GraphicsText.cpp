@@ -360,7 +360,7 @@ bool GraphicsText::isBlank() const
     return toPlainText().simplified().trimmed().isEmpty();
 }
 
-// What the units ask for
+// ITextSurface: what the units need from the item
 
 void GraphicsText::setWritable(bool writable)
 {
@@ -405,7 +405,7 @@ void GraphicsText::showShadow(const TShadow& shadow)
     m_shadowEffect->setEnabled(shadow.getShadowDirectionX() != 0 || shadow.getShadowDirectionY() != 0);
 }
 
-// What the units report
+// ITextObjectListener: what the units report
 
 void GraphicsText::contentsEdited(TText& before, TText& after, TText& lastBefore, TText& lastAfter)
 {
@@ -460,7 +460,7 @@ void GraphicsText::keyboardWanted(bool wanted)
 void GraphicsText::keyboardClosed()
 {
     LOG_DEBUG_OPERATE(L"Edit Area", 200, L"*****SoftKeyBoardClosed event is received*****");
-    // What was typed has to become an undo step before anything that happens later.
+    // Pushes the undo step of the typed text first, so that no later step is pushed before it.
     m_styleEditor->pushLastEditTextIntoStack();
     if (!(m_styles->undoBaseline() == m_styles->current())) {
         TText before = m_styles->undoBaseline();
@@ -532,7 +532,7 @@ QRectF GraphicsText::boundingRect() const
     const GraphicsText* child = m_parentObject ? childTextItem() : nullptr;
     if (!child)
         return layoutRect();
-    // The frame runs around the child.
+    // The frame is drawn around the child.
     constexpr double pen = ITEMBOUNDINGWIDTH / 2.0;
     return layoutRect().united(child->layoutRect()).adjusted(-pen, -pen, pen, pen);
 }

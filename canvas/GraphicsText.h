@@ -39,8 +39,8 @@ class GraphicsText : public QGraphicsTextItem, private ITextSurface, private ITe
 public:
     enum { Type = CanvasTextField::ITEM_TYPE };
 
-    // A child that shows a copy of the record (null: a default record without characters). An id that is not
-    // 0 becomes the id of the copy.
+    // Makes a child that shows a copy of the record (null: a default record without characters). An id that
+    // is not 0 becomes the id of the copy.
     GraphicsText(TText* record, int id, QGraphicsItem* parent = nullptr, QGraphicsScene* scene = nullptr);
     // Makes a parent, or with parentObject false an empty child, and adds it to the scene when one is given.
     GraphicsText(bool parentObject, QGraphicsItem* parent, QGraphicsScene* scene);

@@ -27,7 +27,7 @@ public:
     // Returns the raster pixels per stored pixel.
     virtual double canvasRatio() const = 0;
     // Lets Qt's text item handle a mouse or key event as one of the given type; other types are ignored. The
-    // two types may differ: Qt passes a double click on an object without focus on as a press.
+    // two types may differ: Qt treats a double click on an object without focus as a press.
     virtual void handleByTextItem(QEvent::Type type, QEvent& event) = 0;
 
     // Call before the layout changes: the frame of the pair changes with it.

@@ -27,6 +27,6 @@ public:
     virtual void folderRenamed(const QString& /*before*/, const QString& /*after*/) {}
 
 Q_SIGNALS:
-    // The list picture of the title at path is ready.
+    // Emitted when the list picture of the title at path is ready.
     void saveHalfThumbnailsOK(QString path, QImage image);
 };

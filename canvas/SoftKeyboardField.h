@@ -4,7 +4,7 @@
 
 class GraphicsText;
 
-// Describes a text object to the soft keyboard in the name that the object has as an input field.
+// Makes the object name with which a text object, as an input field, describes itself to the soft keyboard.
 class SoftKeyboardField
 {
 public:

@@ -88,7 +88,7 @@ public:
     static QString textOf(const TextStyle& style);
     // Returns the text to store in the style at index i of the characters.
     static QString storedText(const QString& characters, qsizetype index);
-    // Brings a record of any origin to one style per position and at most CHARACTER_LIMIT characters.
+    // Converts any record to one style per position and at most CHARACTER_LIMIT characters.
     static void normalise(TText& record);
 
 private:

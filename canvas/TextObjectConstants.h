@@ -29,7 +29,7 @@ inline constexpr double LIMITEDNUM = 100.0;
 
 inline constexpr double DOCUMENT_MARGIN = 27.0;
 inline constexpr double BIG_DOCUMENT_MARGIN = 40.5;
-// Sum of both margins beside a line, as part of its height: room for the handles.
+// Left and right margin of a line together, as a fraction of its height: room for the handles.
 inline constexpr double MARGIN_SHARE_OF_LINE = 0.6;
 inline constexpr double HANDLEPIXMAPWIDTH = 24.0;
 inline constexpr double HANDLEPIXMAPHEIGHT = 27.0;
@@ -77,7 +77,7 @@ enum StyleProperty {
 // Undo flag of a style change: a preview is not an undo step and is taken back by Cancel.
 enum UndoFlag { PreviewedChange = 0, CommittedChange = 1, CancelledChange = 2 };
 
-// Focus flag and bounding line status.
+// Values of the focus flag and of the bounding line status.
 enum FocusState { FocusNone = -1, FocusEdit = 0, FocusObject = 1 };
 
 } // namespace TextObjectConstants

@@ -450,7 +450,7 @@ void TextStyleEditor::reportMovedObject()
     m_styles.refreshUndoBaseline();
 }
 
-// What the panel shows
+// Reports to the panel
 
 void TextStyleEditor::reportStyle(const TextStyle& style)
 {

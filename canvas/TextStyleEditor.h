@@ -38,7 +38,7 @@ public:
     void clearSelection();
     // Reports the object's style and place and makes them the state that undo returns to.
     void reportMovedObject();
-    // Offset (0,0) switches the shadow off.
+    // Applies the shadow of the record; an offset of (0,0) switches it off.
     void applyShadow();
 
     // Turns the typing since the last step into an undo step.

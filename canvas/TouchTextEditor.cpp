@@ -313,8 +313,8 @@ void TouchTextEditor::passReleaseToDocument(QGraphicsSceneMouseEvent* event)
 void TouchTextEditor::cancelTouch()
 {
     m_longPressTimer.stop();
-    // A release ends the gesture of the text control and the dragging of the item, without the effects that a
-    // release has in this class.
+    // Sends a release, which ends the gesture of Qt's text control and the dragging of the item, without the
+    // effects that a release has in this class.
     QGraphicsSceneMouseEvent release(QEvent::GraphicsSceneMouseRelease);
     release.setButton(Qt::LeftButton);
     release.setPos(m_state.pressPoint);
@@ -597,7 +597,7 @@ void TouchTextEditor::getSelectionInfo(int begin, int end, int current, int mode
     case 1:
         m_state.handleCaret = true;
         if (m_state.gesture == Gesture::Press || m_state.gesture == Gesture::LongPress)
-            m_state.gesture = Gesture::None; // the finger does not drag an end of this selection
+            m_state.gesture = Gesture::None; // the finger is not on an end of this selection
         selectionFromBeginToEnd(begin, end);
         shadowAndAlign = wholeTextSelected() && m_surface.getFocusFlag() == FocusEdit;
         break;

@@ -7,8 +7,8 @@
 extern "C" int LLVMFuzzerTestOneInput(const std::uint8_t* data, std::size_t size)
 {
     const std::string_view bytes = FuzzFolder::view(data, size);
-    // The program creates the folders named in the file. Skips names with dots in any notation, so that none
-    // is created outside the fuzz folder.
+    // Skips input with dots in any notation: the program creates the folders named in the file, and none may
+    // be outside the fuzz folder.
     if (bytes.find("..") != std::string_view::npos || bytes.find("&#") != std::string_view::npos)
         return 0;
     const std::string base = FuzzFolder::instance().base();

@@ -66,8 +66,8 @@ GalleryPage GalleryPages::toolsBar()
     empty->resetToDefaultState();
     empty->slotDisableNewTextButton(true);
     page.pose = [full](Fingers& fingers) {
-        // The bar draws its menu in its event filter, which the application's filter calls. That one does not
-        // exist during a pose.
+        // The bar draws its menu in its event filter. The application's filter, which normally calls it, does
+        // not exist during a pose.
         full->findChild<QMenu*>()->installEventFilter(full);
         full->findChild<KSPushbutton*>(QStringLiteral("SafeArea"))->click();
         fingers.pressWidget(0, full->findChild<KSPushbutton*>(QStringLiteral("Folder")), QPoint(60, 30));

@@ -27,7 +27,7 @@ FolderEditor::FolderEditor(QWidget* parent)
 {
     setFocusPolicy(Qt::StrongFocus);
     setContextMenuPolicy(Qt::NoContextMenu);
-    setAttribute(Qt::WA_AcceptTouchEvents); // otherwise the list behind handles the touch
+    setAttribute(Qt::WA_AcceptTouchEvents); // otherwise the list below it handles the touch
     setFrame(false);
     QFont nameFont = font();
     nameFont.setPixelSize(FONT_SIZE);

@@ -13,7 +13,8 @@ class ColorButton : public KSPushbutton
 public:
     explicit ColorButton(QWidget* parent);
 
-    // "rgba(<red>, <green>, <blue>, <alpha>)" for a style sheet; a text that is not a colour gives black.
+    // Returns "rgba(<red>, <green>, <blue>, <alpha>)" for a style sheet; black for a text that is not a
+    // colour.
     static QString getRgbaValue(const QString& color);
 
     // Sets "background-color" to the colour and adds the rest of the declarations.

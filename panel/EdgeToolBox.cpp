@@ -71,7 +71,7 @@ QString EdgeToolBox::getRgbaValue(const QString& color) const
     return ColorButton::getRgbaValue(color);
 }
 
-// What the operator does
+// Actions of the operator
 
 void EdgeToolBox::onEdgeBtnClicked()
 {
@@ -138,7 +138,7 @@ void EdgeToolBox::hideEdgeSliderMenu()
         m_slider->close();
 }
 
-// What is shown
+// Showing values
 
 void EdgeToolBox::setEdge(int on, const TEdge& edge, bool preview)
 {

@@ -8,7 +8,7 @@
 #include <private/qunixeventdispatcher_qpa_p.h>
 
 // A clock for a program whose timers are stopped. When the test advances it, the timers that become due fire
-// in order, each as often as it would.
+// in order, each as often as its interval requires.
 class HandClock
 {
 public:

@@ -98,7 +98,7 @@ private:
             const QString path = files.next();
             const bool isTitle = path.endsWith(QLatin1String(".xml"));
             if (isTitle && files.fileInfo().path() == root)
-                continue; // settings
+                continue; // a settings file
             if ((!isTitle && !withPictures) || !isNew(path))
                 continue;
             const bool isWhole = isTitle ? readTitle(path) : !QImage(path).isNull();
