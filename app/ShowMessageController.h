@@ -39,7 +39,7 @@ public:
 
     void changeTopWindow(MessageDefine::_emTopWindow top);
 
-    // A mask is shown only while the main window is visible, but hidden at any time.
+    // Show a mask, if the main window is visible, or hide it, which is always possible.
     void showDialogOpacityWidget();
     void hideDialogOpacityWidget();
     void showMessageOpacityWidget();

@@ -56,7 +56,7 @@ public:
     static const int ARCHIVELISTWIDGET_WIDTH;
     static const double OPACITY_VALUE;
 
-    // With deferArchiveList the list stays empty until a request names a folder.
+    // Builds the window. With deferArchiveList the list stays empty until a request names a folder.
     TitlerWindow(bool deferArchiveList, QWidget* parent);
     ~TitlerWindow() override;
 

@@ -144,9 +144,9 @@ Q_SIGNALS:
     void signalItemSelected(QGraphicsItem* item);
     void signalPixmapItemInserted(QGraphicsPixmapItem* item);
     void signalSaveOk(QString path, QImage image);
-    // The style is valid during the call only.
+    // Reports the style of the selection, which is valid during the call only.
     void signalNotifyPropertyAreaUpdateCurrentTextStyle(TText* style);
-    // The receiver owns the command.
+    // Passes an undo command to the receiver, which owns it.
     void signalPushUndoCommandIntoStack(QUndoCommand* command);
     void signalSceneNotifyIfExistSelectedObject(bool exists);
     void signalSceneNotifyTextPropertyAreaObjectSelectionMode(bool shadowAndAlign, bool move);

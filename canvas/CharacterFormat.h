@@ -18,7 +18,8 @@ public:
     // installed.
     static bool familyIsInstalled(const QString& family);
 
-    // ratio: raster pixels per stored pixel. Sizes are kept within 1 to 999 stored pixels.
+    // Returns the font of a style. ratio: raster pixels per stored pixel. Sizes are limited to 1 to 999
+    // stored pixels.
     static QFont font(const TextStyle& style, double ratio);
     static int pixelSize(const TextStyle& style, double ratio);
 

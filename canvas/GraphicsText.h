@@ -91,11 +91,12 @@ public:
 
     // Sets the row of the font tables, which all objects share.
     void setInputLanguage(int row);
-    // With 1 the first character of an empty object takes the family used last for its script.
+    // Sets how the family of the first character is chosen: with 1 the first character of an empty object
+    // takes the family used last for its script.
     void setFontFamilyEnsureMode(int mode);
-    // ratio: raster pixels per stored pixel; big: laid out for the 1920 raster.
+    // Sets the scale of the layout. ratio: raster pixels per stored pixel; big: laid out for the 1920 raster.
     void setRadio(double ratio, bool big);
-    // With true boundingRect() is limited to the raster and 100 pixels around it.
+    // Sets whether boundingRect() is limited to the raster and 100 pixels around it.
     void setBoundingRectFlag(bool flag);
 
     // Cancels the current touch: it selects and edits nothing, and a dragged object returns to where it was.

@@ -20,7 +20,7 @@ public:
     void cancelTouch() { m_finger.cancel(); }
 
 Q_SIGNALS:
-    // A finger was lifted. Emitted before the release reaches the scene.
+    // Emitted when a finger was lifted, before the release reaches the scene.
     void deleteEmptyItem();
 
 public Q_SLOTS:

@@ -20,7 +20,8 @@ public:
 
     static MessageBoxController* getInstance();
     static void clearInstance();
-    // Either both functions are given, or both are null, which removes the provider.
+    // Sets the functions of the provider. Either both are given, or both are null, which removes the
+    // provider.
     static void setProvider(MessageBoxController* (*get)(), void (*clear)());
 
 public Q_SLOTS:

@@ -20,10 +20,10 @@ public:
 
     TText& current() { return m_current; }
     const TText& current() const { return m_current; }
-    // A record of one style, which the next character takes while the record has no characters.
+    // Returns a record of one style, which the next character takes while the record has no characters.
     TText& lastAlpha() { return m_lastAlpha; }
     const TText& lastAlpha() const { return m_lastAlpha; }
-    // The style of the next typed character while nextInsertSaved() is true.
+    // Returns the style of the next typed character, which is used while nextInsertSaved() is true.
     TText& nextInsert() { return m_nextInsert; }
     TText& undoBaseline() { return m_undoBaseline; }
     TText& editStart() { return m_editStart; }

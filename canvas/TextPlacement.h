@@ -27,7 +27,7 @@ public:
     QPointF adjustItemPos(Side side);
 
     bool isPair() const;
-    // The position of the item that places the object.
+    // Returns the position of the item that places the object.
     QPointF place() const;
     void setPlace(QPointF place);
     // Returns the position of the child. It differs from place() while Qt drags the child.

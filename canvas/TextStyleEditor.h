@@ -43,7 +43,7 @@ public:
 
     // Turns the typing since the last step into an undo step.
     void pushLastEditTextIntoStack();
-    // The timer that ends a burst of typing. Connect its timeout to undoTimeOut().
+    // Returns the timer that ends a burst of typing. Connect its timeout to undoTimeOut().
     const QTimer& undoTimer() const { return m_undoTimer; }
     void undoTimeOut();
     // Returns whether there is typing that is not part of an undo step yet.

@@ -33,7 +33,7 @@ public:
     // Ends the current press without a release.
     void cancelTouch();
     void keyPress(QKeyEvent* event);
-    // The timer of the long press. Connect its timeout to longPressed().
+    // Returns the timer of the long press. Connect its timeout to longPressed().
     const QTimer& longPressTimer() const { return m_longPressTimer; }
     void longPressed();
     // Returns whether the event is handled and has to be swallowed.

@@ -116,7 +116,7 @@ public:
 Q_SIGNALS:
     // Sends a title to the canvas; null when there is none to show. The list keeps owning the record.
     void signalUpdateCanvas(const Archive* archive);
-    // The receiver takes ownership of the command.
+    // Passes an undo command to the receiver, which takes ownership of it.
     void deleteCommandSignal(QUndoCommand* command);
     void pasteCommandSignal(QUndoCommand* command);
     void createCommandSignal(QUndoCommand* command);
@@ -161,7 +161,7 @@ public Q_SLOTS:
     // Takes ownership of the records.
     void getArchiveListSuccessed(QList<Archive*> archivesList);
     void moveCurrentArchiveItemVisble();
-    // The scene is not owned.
+    // Sets the canvas, which is not owned.
     void setMainScene(CanvasScene* mainScene) { mMainScene = mainScene; }
     void wheelEvent(QWheelEvent* event) override;
 

@@ -16,7 +16,7 @@ public:
     // Updates the texts after a change of language.
     void translateText();
 
-    // onItem: the menu was opened on a title. hasCopy: the clipboard contains a title.
+    // Enables the entries. onItem: the menu was opened on a title. hasCopy: the clipboard contains a title.
     void enableFor(bool onItem, bool hasCopy);
 
     ArchiveAction* action(ArchiveAction::ARCHIVE_ACTION_TYPE type) const;

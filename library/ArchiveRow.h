@@ -15,11 +15,11 @@ class FolderTitles;
 class ArchiveRow : public ScrollViewerRow
 {
 public:
-    // A title whose file is read when the record is needed. number is its index in the titles; record may be
-    // null. The list must outlive the row.
+    // Makes a row for a title whose file is read when the record is needed. number is its index in the
+    // titles; record may be null. The list must outlive the row.
     ArchiveRow(ArchiveList& list, std::shared_ptr<const FolderTitles> titles, std::size_t number,
                std::unique_ptr<Archive> record);
-    // A title that exists as a record only.
+    // Makes a row for a title that exists as a record only.
     ArchiveRow(ArchiveList& list, std::unique_ptr<Archive> record);
     ~ArchiveRow() override;
 

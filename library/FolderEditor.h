@@ -21,15 +21,15 @@ public:
     explicit FolderEditor(QWidget* parent = nullptr);
 
 Q_SIGNALS:
-    // The text typed or pasted contains refused characters, is too long, or is valid.
+    // Emitted when the text typed or pasted contains refused characters, is too long, or is valid.
     void signalInvalidInput();
     void signalLongInput();
     void signalValidInput();
-    // The editor was removed from its row, with or without a change of the name.
+    // Emitted when the editor was removed from its row, with or without a change of the name.
     void signalEditStateEnd();
     void signalPressedEnter();
     void signalPressedEscape();
-    // The soft keyboard was closed.
+    // Emitted when the soft keyboard was closed.
     void signalPressedClose();
 
 protected:

@@ -91,12 +91,13 @@ public:
     FolderEdit editAction() const { return mEdit->action(); }
 
 Q_SIGNALS:
-    // The operator has picked a folder or a title. Full paths of folders; the name of a title file.
+    // Emitted when the operator has picked a folder or a title. Full paths of folders; the name of a title
+    // file.
     void changeFolderPath(QString path);
     void changeFolderFile(QString path, QString fileName);
-    // The folder that is open in the editor was renamed by another process.
+    // Emitted when another process has renamed the folder that is open in the editor.
     void folderNameChange(QString before, QString after);
-    // A folder was renamed by this or another process, whether it is open or not. Emitted before
+    // Emitted when this or another process has renamed a folder, whether it is open or not. Comes before
     // folderNameChange().
     void folderMoved(QString before, QString after);
     void clearUndoCommandStack();
@@ -126,7 +127,7 @@ public Q_SLOTS:
     void slotLongInput() { mEdit->slotLongInput(); }
     void slotValidInput() { mEdit->slotValidInput(); }
     void slotTextChanged(QString) {} // the field itself keeps the text
-    // A message box was closed.
+    // Called when a message box was closed.
     void reCallcallSoftKeyBoard(MessageDefine::tagCloseParam param) { mEdit->messageClosed(param); }
 
     // Called when another process renamed or deleted a folder. Takes names or full paths, of which the last

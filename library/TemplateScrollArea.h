@@ -36,7 +36,7 @@ public:
     void letGoOf(TouchEventButton* button);
 
 Q_SIGNALS:
-    // A button was tapped, without a drag.
+    // Emitted when a button was tapped, without a drag.
     void itemPressed(QPushButton* button);
 
 protected:

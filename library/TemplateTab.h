@@ -65,10 +65,10 @@ public:
     TemplateScrollArea* scrollArea() const { return mScrollArea; }
 
 Q_SIGNALS:
-    // An item was selected by touch or mouse.
+    // Emitted when an item was selected by touch or mouse.
     void itemSelected(int index, TemplateItem* item);
     void itemPressed(QPushButton* button);
-    // The selection has changed or was cleared.
+    // Emitted when the selection has changed or was cleared.
     void selectionChanged();
 
 private Q_SLOTS:

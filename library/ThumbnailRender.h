@@ -41,9 +41,9 @@ public:
     // Drops pictures that are queued and not begun.
     ~ThumbnailRender() override;
 
-    // With false runs the fast stage, which emits saveHalfThumbnailsOK(). With true runs the slow stage,
-    // which queues the files: another thread decodes the background, and the picture is drawn in a later
-    // event of the event loop. Null does nothing. The record is not changed.
+    // Makes the pictures of the title. With false runs the fast stage, which emits saveHalfThumbnailsOK().
+    // With true runs the slow stage, which queues the files: another thread decodes the background, and the
+    // picture is drawn in a later turn of the event loop. Null does nothing. The record is not changed.
     void makeThumbnail(const Archive* archive, bool bigSize) override;
     // Returns whether every queued picture is written. Draws the pictures that are still to be drawn first,
     // so that callers can wait without an event loop.

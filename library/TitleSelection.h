@@ -13,8 +13,8 @@ public:
     ArchiveItem* selected() const;
     ArchiveItem* operation() const;
 
-    // Ignored for null, like the functions below. The caller has to reset the look of the item that was
-    // marked before.
+    // Change which item is marked, or its look; null is ignored. The caller has to reset the look of the item
+    // that was marked before.
     void select(ArchiveItem* item);
     // Gives the item the look of the selected one, without a border.
     static void showSelected(ArchiveItem* item);

@@ -12,7 +12,7 @@ class Archive;
 class UserTemplatePickerController : public ITemplateSource
 {
 public:
-    // The caller owns the records.
+    // Returns the user templates; the caller owns the records.
     QVector<Archive*> getTemplates();
     std::string getLastSelectedTemplate() override;
     void saveSelectedTemplate(std::string path) override;

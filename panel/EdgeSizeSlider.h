@@ -30,7 +30,7 @@ public:
     void translateText();
 
 Q_SIGNALS:
-    // The operator moved the slider.
+    // Emitted when the operator has moved the slider.
     void sliderValueSignal(int value);
 
 protected:

@@ -55,10 +55,11 @@ public:
     void translateText() override;
 
 Q_SIGNALS:
-    // undoFlag: 0 for a preview, 1 for an undo step, 2 when the palette was cancelled.
+    // Emitted when the operator has changed the edge. undoFlag: 0 for a preview, 1 for an undo step, 2 when
+    // the palette was cancelled.
     void edgeChange(int on, TEdge edge, int id, int undoFlag, int kind);
     void signalShowEdgeSlider(bool shown);
-    // The colour button was tapped.
+    // Emitted when the colour button was tapped.
     void clicked();
 
 private:

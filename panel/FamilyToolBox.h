@@ -29,7 +29,7 @@ public:
 
     // Called when a font file was added to the folder of imported fonts, with the name of the file.
     void importFontFamilyNotify(const QString& file);
-    // With true offers all families, with false the imported ones only.
+    // Sets which families are offered: with true all, with false the imported ones only.
     void modifyComboxItem(bool isAllItems);
     void hideComboxList();
     FontCombox* comboBox() const { return m_box; }

@@ -17,9 +17,9 @@ public:
 
     explicit FontCombox(QWidget* parent);
 
-    // With true offers the appliance's families and the imported ones, with false the imported ones only. A
-    // family that the font system cannot resolve is left out. Keeps the current family if it is still in the
-    // list.
+    // Fills the list: with true with the appliance's families and the imported ones, with false with the
+    // imported ones only. A family that the font system cannot resolve is left out. Keeps the current family
+    // if it is still in the list.
     void refreshFontListView(bool isAllItems);
     // Registers one file of the folder of imported fonts; with all, drops every import and registers the
     // whole folder. With fromSettings the path of the folder is read from the settings, otherwise the path

@@ -48,7 +48,7 @@ public:
     bool eventFilter(QObject* watched, QEvent* event) override;
 
 Q_SIGNALS:
-    // direction: one of the button indices.
+    // Emitted when a direction was tapped. direction: one of the button indices.
     void moveRangeChanged(int range, int direction, int id);
 
 private:

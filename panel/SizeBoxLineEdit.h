@@ -9,7 +9,7 @@ class SizeBoxLineEdit : public QLineEdit
 public:
     explicit SizeBoxLineEdit(QWidget* parent = nullptr);
 
-    // With 1 the field is enabled; with any other value its text is grey.
+    // Sets the look: 1 is enabled; any other value makes the text grey.
     void setState(int state);
     int state() const { return m_state; }
 

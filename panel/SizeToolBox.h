@@ -44,7 +44,7 @@ public:
     // Returns the size shown, the smallest one of a mixed selection.
     int getFontSize() const;
 
-    // With true discards a size that is being typed: shows the last valid one and leaves the field.
+    // Discards, with true, a size that is being typed: shows the last valid one and leaves the field.
     void clearFocusOfSizeBoxLineEdit(bool clear);
     // Called with the result of the validator for the text being typed.
     void setValid(bool valid);

@@ -17,7 +17,7 @@ public:
 
     explicit TextColorToolBox(QWidget* parent);
 
-    // "#rrggbb".
+    // Shows the colour, "#rrggbb".
     void setColor(const QString& color);
     QString getColor() const { return m_color; }
     // Called with the answer of the palette: state 0 preview, 1 OK, 2 Cancel.
@@ -30,7 +30,7 @@ public:
 
 Q_SIGNALS:
     void textColorChange(QString color, int id, int state);
-    // The button was tapped.
+    // Emitted when the button was tapped.
     void clicked();
 
 private:

@@ -98,7 +98,7 @@ public Q_SLOTS:
     void getColorValue(QString color, int state);
     void titlerWindowRectSlot(QRect rect);
     void slotImportNewFontFamlies(QString file);
-    // With true offers all families, with false the imported ones only.
+    // Sets which families are offered: with true all, with false the imported ones only.
     void modifyFontFamilyComboxItem(bool isAllItems);
     void slotCanvasSceneMouseTouched();
     void slotHideColorPaletteWhenCloseSoftWare();

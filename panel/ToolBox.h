@@ -56,7 +56,8 @@ protected:
     // Position of a button in a switch, which decides which of its ends are round.
     enum Piece { Whole, LeftPiece, MiddlePiece, RightPiece };
 
-    // icon: path of the icon at rest, next to the files for its other states. Empty for a button with a text.
+    // Adds a button. icon: path of the icon at rest, next to the files for its other states; empty for a
+    // button with a text.
     KSPushbutton* addButton(Piece piece, const QSize& size, const QString& icon = QString());
     // Adds a label; the box applies the style for its state.
     QLabel* addLabel(const QSize& size, const QString& restStyle = LABEL_REST_STYLE,
