@@ -46,7 +46,8 @@ public:
     ~ArchiveItem() override;
 
     Archive* getArchiveData() const { return mArchive; }
-    // Drops the record at once and deletes the item later, when no event is being delivered to it.
+    // Detaches the item from its record at once, and deletes it later, when no event is being delivered to
+    // it.
     void discard();
     // Returns whether the item is not null and not discarded.
     static bool isUsable(const ArchiveItem* item) { return item && item->mArchive; }

@@ -33,7 +33,7 @@ class FolderPicker : public QDialog
     Q_OBJECT
 
 public:
-    static const int LEFT_WIDTH = 240; // width of the area for the picture of a title; the height follows
+    static const int LEFT_WIDTH = 240; // width of the picture of a title; its height follows
     static const int WIDGET_HEIGHT = 135;
     static const int HSEPARATOR_LENGTH = 1069;
     static const int LIMIT_REMAIN = FolderPickerController::LIMIT_REMAIN;

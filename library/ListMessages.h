@@ -8,9 +8,9 @@
 namespace ListMessages
 {
 
-// The largest number of titles in a folder.
+// Limit for the number of titles in a folder.
 constexpr int TITLE_LIMIT = 99;
-// The largest number of user templates.
+// Limit for the number of user templates.
 constexpr int TEMPLATE_LIMIT = 998;
 
 // Posts the message, with the text if it is not empty. Does nothing without a message service. GUI thread.
