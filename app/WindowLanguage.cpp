@@ -19,7 +19,7 @@ bool WindowLanguage::switchTranslator(SystemSetupDef::emSystemLanguageType langu
     }
     const bool isChinese = language == SystemSetupDef::emSystemLanguageChinese;
     const QString file = m_folder + (isChinese ? QStringLiteral("cn.qm") : QStringLiteral("en.qm"));
-    // A failed load empties the translator, so the file is tried with another one first to keep the previous
+    // A failed load empties the translator, so another one tries the file first, to keep the previous
     // language.
     if (QTranslator probe; !probe.load(file) || !m_translator->load(file))
         return false;

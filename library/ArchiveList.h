@@ -78,8 +78,8 @@ public:
     // Empties the list, the path and the label.
     void cleanArchiveList();
     void clearCopyArchive() { mActions->clearCopyArchive(); }
-    // Removes the files of titles that are no longer in the list. Does nothing when the order file of the
-    // folder is not reliable.
+    // Saves the order again if its file is damaged. Removes the files of titles that are no longer in the
+    // list, unless the order could not be read when the folder was opened, or not be written since.
     void synchronizationFolderFile();
     void stopArchiveListTapAndHoldTimer() { stopTapAndHoldTimer(); }
     void setSystemLanFont(QString family);
