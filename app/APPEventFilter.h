@@ -2,16 +2,16 @@
 
 #include "touchui/KSAppEventFilter.h"
 
-// The application's one event filter: the gate of the touch library with the lock between the processes of
-// the appliance.
+// The application-wide event filter: the touch gate of the touch library, extended by the lock between the
+// processes of the appliance.
 class APPEventFilter : public KSAppEventFilter
 {
     Q_OBJECT
 public:
-    // Made at the first call, with the controller of the touch locks, and installed on the application; null
-    // without an application.
+    // Returns the filter, which the first call creates, with the controller of the touch locks, and installs
+    // on the application. Null without an application.
     static APPEventFilter* instance();
-    // Takes it off the application and deletes it.
+    // Removes the filter from the application and deletes it.
     static void release();
 
     using KSAppEventFilter::createLockObject;

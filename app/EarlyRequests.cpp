@@ -64,7 +64,8 @@ void EarlyRequests::carryOutKept()
         QMetaObject::invokeMethod(this, &EarlyRequests::carryOutNext, Qt::QueuedConnection);
 }
 
-// A request may open a dialog with an event loop of its own: the next one does not wait for its end.
+// Schedules the next request before this one is carried out, since this one may run an event loop of its own
+// for a dialog.
 void EarlyRequests::carryOutNext()
 {
     if (mKept.empty())

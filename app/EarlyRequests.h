@@ -1,8 +1,3 @@
-// Keeps what siblings ask for until the hand-shakes with their services are through: a window that is shown
-// before would introduce itself without a client id. A service that never gives one holds no request up for
-// longer than PATIENCE.
-//
-// GUI thread.
 #pragma once
 
 #include <QObject>
@@ -13,24 +8,29 @@
 #include <deque>
 #include <functional>
 
+// Queues the requests of sibling processes until the hand-shakes with their services are complete: a window
+// shown earlier would have no client id to send to them. If a service gives no client id, its requests wait
+// for PATIENCE at most.
+//
+// GUI thread.
 class EarlyRequests : public QObject
 {
     Q_OBJECT
 
 public:
     static constexpr std::chrono::seconds PATIENCE{5};
-    // What comes while so many are kept is dropped.
+    // When so many requests are queued, further ones are dropped.
     static constexpr int MAX_KEPT = 64;
 
     static EarlyRequests* getInstance();
-    // Drops what is kept.
+    // Deletes the instance and the queued requests.
     static void clearInstance();
 
-    // The hand-shake with a service has begun, and it has given the client id.
+    // Called when the hand-shake with a service has begun, and when the service has given the client id.
     void expectClientId(long service);
     void clientIdCame(long service);
 
-    // Carries the request out at once, or after the hand-shakes and those that came before it.
+    // Carries out the request, at once or after the hand-shakes and the requests queued before it.
     void carryOut(std::function<void()> request);
 
 private Q_SLOTS:
@@ -44,7 +44,7 @@ private:
 
     static EarlyRequests* mInstance;
 
-    QSet<long> mExpected; // services
+    QSet<long> mExpected; // ids of the services whose client id is missing
     std::deque<std::function<void()>> mKept;
     QTimer mPatience;
 };

@@ -93,7 +93,8 @@ void EditContextController::sentITitlerCallBack(const std::wstring& folder)
     setITitlerNoCallBack();
 }
 
-// A file that the order does not know keeps the old order for all: the list is replaced whole or not at all.
+// Sorts the list by the order of the folder. If the order does not contain all files, the list stays as it
+// is.
 void EditContextController::orderFilePathList(const QString& folder)
 {
     QList<std::wstring> ordered;

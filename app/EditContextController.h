@@ -1,8 +1,3 @@
-// Remembers what a request asked for, from the request to the answer: who asked, whether titles are to be
-// created, and which files were made in the session. The window shows what signalShowTitlerParameter tells
-// and calls sentITitlerCallBack when the operator closes.
-//
-// GUI thread only.
 #pragma once
 
 #include <QList>
@@ -18,6 +13,11 @@
 
 class ArchiveController;
 
+// Keeps the request of a session until it is answered: the process that sent it, whether titles are to be
+// created, and the files created in the session. The window is shown on signalShowTitlerParameter() and calls
+// sentITitlerCallBack() when the operator closes it.
+//
+// GUI thread only.
 class EditContextController : public QObject, public IEditContext
 {
     Q_OBJECT
@@ -29,21 +29,22 @@ public:
     void showTitlerCreate(_CALL_TITLER_TYPE type);
     void showTitlerEdit(const _SHOW_TITLER_PARAMTER& param);
 
-    // The proxy to the asker: taken over, kept across sessions, replaced by a later one. Null is allowed.
+    // Takes ownership of the proxy to the process that sent the request. It is kept across sessions until
+    // another one replaces it; null is allowed.
     void resultCallBack(ITitlerCallBack* callBack);
 
-    // Titles are told by the plain file name, as in the order file of the folder.
+    // Titles are identified by the plain file name, as in the order file of the folder.
     bool isCreateNew() override;
     bool isMainNeedMsg();
     bool isNewCreateFile(std::wstring path) override;
     void insertFilePath(std::wstring path) override;
     void deleteFilePath(std::wstring path) override;
 
-    // Ends the session: no result will be sent.
+    // Ends the session without sending a result.
     void setITitlerNoCallBack();
 
-    // Sends the titles made in a create session, in the order of the folder, and ends the session. Without a
-    // callback, or outside a create session, nothing happens.
+    // Sends the titles created in a create session, in the order of the folder, and ends the session. Does
+    // nothing without a callback or outside a create session.
     void sentITitlerCallBack(const std::wstring& folder);
 
 Q_SIGNALS:

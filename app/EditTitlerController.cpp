@@ -60,7 +60,8 @@ void EditTitlerController::renameFolderStartStatus(QString folder)
         mLink->renameFolderStart({mLink.clientId(), folder.toStdWString()});
 }
 
-// The picture thread reports through here too; a sender must not be shared between threads.
+// Queued to the GUI thread, since the picture thread calls this, too, and a sender must be used in one thread
+// only.
 void EditTitlerController::changeTitlerStatus(FileManagerDefine::emTITLECHANGE_TYPE type, QString path)
 {
     if (QThread::currentThread() != thread()) {

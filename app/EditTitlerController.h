@@ -1,8 +1,3 @@
-// The link to the file manager service: reports what this program changes in the title folders, and hands on
-// notices of what was changed elsewhere (fonts and templates imported, templates deleted or renamed, folders
-// renamed or deleted).
-//
-// changeTitlerStatus may be called from any thread; the rest belongs to the GUI thread.
 #pragma once
 
 #include <QObject>
@@ -15,6 +10,11 @@
 #include "messaging/services/FileManagerDefine.h"
 #include "messaging/services/IFileManagerController.h"
 
+// The link to the file manager service: reports changes that this program makes in the title folders, and
+// forwards notices of changes by other processes (fonts and templates imported, templates deleted or renamed,
+// folders renamed or deleted).
+//
+// changeTitlerStatus() may be called from any thread, everything else from the GUI thread only.
 class EditTitlerController : public QObject,
                              public IFileManagerControllerCallBack,
                              public IFileManagerControllerNotify,
@@ -29,7 +29,7 @@ public:
 
     void setFactory(TitlerToolFactory* factory);
 
-    // Folder paths are full paths.
+    // Full folder paths.
     void editFolderStartStatus(QString folder) override;
     void editFolderEndStatus(QString folder) override;
     void renameFolderStartStatus(QString folder) override;

@@ -1,4 +1,3 @@
-// Says in the operator's words what of his work is in memory only. GUI thread.
 #pragma once
 
 #include "support/RefusedWrites.h"
@@ -8,12 +7,14 @@
 #include <string>
 #include <vector>
 
+// Describes unsaved work to the operator. GUI thread.
 class LossDescription
 {
     Q_DECLARE_TR_FUNCTIONS(LossDescription)
 
 public:
-    // Names titles by their first text, and the folders whose order is concerned; the first few of many.
+    // Returns a text that names titles by their first text, and the folders whose order is not saved; of many
+    // only the first few.
     static QString of(const std::vector<RefusedWrites::File>& files);
 
 private:

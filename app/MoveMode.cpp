@@ -18,7 +18,7 @@ const char BUTTON_IMAGES[] =
     "Button-38selected_Rest_Left:Button-38selected_Rest_Center:Button-38selected_Rest_Right:"
     "Button-38selected_Pressed_Left:Button-38selected_Pressed_Center:Button-38selected_Pressed_Right:::";
 
-// Global coordinates; nothing for an event that is not a press.
+// Returns the global position of a press or wheel event; nothing for other events.
 std::optional<QPoint> placeOfPress(const QEvent* event)
 {
     switch (event->type()) {
@@ -84,6 +84,6 @@ bool MoveMode::isEndedBy(const QObject* receiver, const QEvent* event, const QWi
     if (!isOn() || receiver == m_button)
         return false;
     const std::optional<QPoint> place = placeOfPress(event);
-    // A press on the button is seen first at the window that holds it.
+    // The window that contains the button receives a press on it first.
     return place && !covers(list, *place) && !covers(m_button, *place);
 }

@@ -3,9 +3,9 @@
 #include "app/EarlyRequests.h"
 #include "app/TitlerToolFactory.h"
 
-// The hand-shake with a service of a sibling process, as all of them have it: the callbacks are registered,
-// the service answers with a client id, and with that the notices are registered. Leaves the service when it
-// is destroyed, if the client id has come. GUI thread.
+// The hand-shake with a service of a sibling process, which is the same for all services: the callbacks are
+// registered, the service answers with a client id, and the notices are registered with this id. Unregisters
+// when it is destroyed, if the client id was received. GUI thread.
 template <typename Service>
 class ServiceLink
 {
@@ -15,13 +15,13 @@ public:
     ServiceLink(const ServiceLink&) = delete;
     ServiceLink& operator=(const ServiceLink&) = delete;
 
-    // Blocks until the sibling listens. Does nothing once the client id has come. The callbacks are not owned
-    // and must outlive this object.
+    // Registers the callbacks. Blocks until the sibling listens. Does nothing if the client id was received
+    // before. The callbacks are not owned and must outlive this object.
     template <typename CallBack>
     void connectTo(TitlerToolFactory* factory, CallBack* callBack);
 
-    // Takes the client id that the service gives. greet is called before any request that has waited for the
-    // hand-shakes. The notices are not owned and must outlive this object.
+    // Call when the service has given the client id: registers the notices. greet is called before any
+    // request that has waited for the hand-shakes. The notices are not owned and must outlive this object.
     template <typename Notify, typename Greeting>
     void clientIdCame(int id, Notify* notify, Greeting greet);
     template <typename Notify>
@@ -30,12 +30,12 @@ public:
         clientIdCame(id, notify, [] {});
     }
 
-    // False while there is no service to call.
+    // Returns whether there is a service to call.
     explicit operator bool() const { return m_proxy != nullptr; }
     Service* operator->() const { return m_proxy; }
-    // Returns whether the client id has come.
+    // Returns whether the client id was received.
     bool isConnected() const { return m_isConnected; }
-    // NO_CLIENT_ID until the service has given one.
+    // Returns the client id, NO_CLIENT_ID before it was received.
     int clientId() const { return m_clientId; }
 
     static constexpr int NO_CLIENT_ID = -1;
@@ -65,7 +65,7 @@ void ServiceLink<Service>::clientIdCame(int id, Notify* notify, Greeting greet)
 {
     m_clientId = id;
     if (m_proxy) {
-        // The services give the same operation two names.
+        // The services have different names for the same operation.
         if constexpr (requires { m_proxy->unregisterNotify(id); })
             m_proxy->registerNotify({notify, id});
         else

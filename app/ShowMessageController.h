@@ -1,8 +1,3 @@
-// The link to the message service, which shows the numbered message boxes on top of everything, and the
-// source of the mask requests that come back from it. Implements what other folders see as
-// MessageBoxController.
-//
-// GUI thread; only the creation of the instance is guarded.
 #pragma once
 
 #include <QMap>
@@ -15,6 +10,10 @@
 #include "messaging/services/IMessageCenter.h"
 #include "messaging/services/MessageDefine.h"
 
+// The link to the message service, which shows the numbered message boxes above all windows, and the source
+// of the service's requests for masks. Other folders use it through the MessageBoxController interface.
+//
+// GUI thread; only the creation of the instance is thread-safe.
 class ShowMessageController : public MessageBoxController,
                               public IMessageCenterCallBack,
                               public IMessageCenterNotify
@@ -27,12 +26,12 @@ public:
 
     void setFactory(TitlerToolFactory* factory) override;
 
-    // Without a link to the service a message is lost silently.
+    // Sends a message; it is lost without a log entry when there is no link to the service.
     void postMessage(MessageDef::Message_ID id) override;
     void postMessage(MessageDef::Message_ID id, QString text) override;
     void postMessage(MessageDef::Message_ID id, MessageDefine::_emBoxType boxType, QString text) override;
 
-    // The window that mask requests need; null is ignored.
+    // Sets the window that has to be visible for requests for masks; null is ignored.
     void setMessageMainWindow(QWidget* window) override;
     bool GetTitlerIsTop() override;
     QMap<QString, QString> getMapData() override;
@@ -40,13 +39,13 @@ public:
 
     void changeTopWindow(MessageDefine::_emTopWindow top);
 
-    // A mask goes up only while the main window shows; it is taken away at any time.
+    // Show a mask, if the main window is visible, or hide it, which is always possible.
     void showDialogOpacityWidget();
     void hideDialogOpacityWidget();
     void showMessageOpacityWidget();
     void hideMessageOpacityWidget();
 
-    // Answers and notices of the service.
+    // Called with answers and notices of the service.
     void setClientID(int id) override;
     void getTopWindowCallBack(int) override {}
     void getTopWindowNotify(int top) override;

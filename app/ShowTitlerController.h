@@ -1,4 +1,3 @@
-// The second way in: the sub panel asks for the window, without wanting a result. GUI thread.
 #pragma once
 
 #include <QObject>
@@ -9,6 +8,7 @@
 
 class TitlerToolFactory;
 
+// Handles requests of the sub panel to show the window, which expect no result. GUI thread.
 class ShowTitlerController : public QObject, public IShowTitlerControllerCallBack
 {
     Q_OBJECT

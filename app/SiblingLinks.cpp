@@ -42,7 +42,7 @@ SiblingLinks::~SiblingLinks()
 void SiblingLinks::initProcessFactory()
 {
     m_factory.reset(new (std::nothrow) TitlerToolFactory);
-    // A port that cannot be bound leaves a window that no request can reach; the siblings' services still
+    // If the port cannot be bound, no request reaches the window, but the services of the siblings still
     // work.
     if (m_factory)
         m_factory->initialize();

@@ -11,47 +11,50 @@ class KSInputContext;
 class QWidget;
 class TitlerToolFactory;
 
-// The links of the window to the sibling processes: the factory that makes them, the controllers of the
-// services, and the input context with its soft keyboard. The controllers are singletons that live as long as
-// this object. Without a link every call does nothing. GUI thread only.
+// The window's links to the sibling processes: the factory that makes them, the controllers of the services,
+// and the input context with the soft keyboard. The controllers are singletons that exist as long as this
+// object. Without a link calls do nothing. GUI thread only.
 class SiblingLinks
 {
 public:
-    // Offers the message service to the folders below, from its first use on.
+    // Makes the message service available to the other folders; it is created on first use.
     SiblingLinks();
-    // Ends the controllers, then the connections. Takes 5 seconds when the power service is connected.
+    // Deletes the controllers, then closes the connections. Takes 5 seconds when the power service is
+    // connected.
     ~SiblingLinks();
     SiblingLinks(const SiblingLinks&) = delete;
     SiblingLinks& operator=(const SiblingLinks&) = delete;
 
-    // Makes the factory and begins to listen for requests.
+    // Makes the factory and starts listening for requests.
     void initProcessFactory();
-    // Makes the hand-shakes with the services. Blocks until both siblings listen.
+    // Begins the hand-shakes with the services. Blocks until both siblings listen.
     void initProcessCommunications(WId window);
-    // Returns whether there are controllers.
+    // Returns whether the controllers exist.
     bool areMade() const { return m_areMade; }
 
-    // Returns whether the message has been sent.
+    // Sends the message. Returns false when the controllers do not exist.
     bool postMessage(MessageDef::Message_ID id);
     bool postMessage(MessageDef::Message_ID id, const QString& text);
-    // Says which program has the topmost window.
+    // Reports which program has the topmost window.
     void changeTopWindow(MessageDefine::_emTopWindow top);
-    // Gives the window that is to show while siblings ask for masks.
+    // Sets the window that has to be visible for requests for masks.
     void setMessageMainWindow(QWidget* window);
 
-    // The folder is being edited here, and is free again; full paths, and an empty one is ignored.
+    // Report that editing of the folder has begun or ended. Full paths; an empty one is ignored.
     void editFolderStarts(const QString& folder);
     void editFolderEnds(const QString& folder);
-    // Delivers what other threads have reported of titles, so that siblings hear of it before what follows.
+    // Delivers the reports on titles that other threads have queued, so that the siblings receive them before
+    // later messages.
     void sendTitleReports();
 
     void sendAPPEvent(APPEventDefine::LOCKTYPE type, bool on);
-    // Has the input language reported again.
+    // Requests that the input language be reported again.
     void getInputLanguage();
 
-    // Null without the program's own input context.
+    // Returns the input context; null when the platform uses another one than this program's.
     KSInputContext* inputContext() const { return m_inputContext; }
-    // Closes it without its closing ceremony: at the end of a session, and in the middle of one.
+    // Close the keyboard without the usual closing sequence: the first at the end of a session, the second
+    // during one.
     void simpleCloseSoftKeyboard();
     void dummyCloseSoftKeyboard();
 

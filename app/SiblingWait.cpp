@@ -31,7 +31,7 @@ bool SiblingWait::waitFor(SocketRemoteSender& sender, long client)
             report();
             isReported = true;
         }
-        ::usleep(RETRY_MS * 1000); // a signal ends it
+        ::usleep(RETRY_MS * 1000); // a signal interrupts it
     }
     sender.setConnectTimeout(SocketRemoteSender::CONNECT_TIMEOUT_MS);
     return true;

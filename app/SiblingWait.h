@@ -1,5 +1,3 @@
-// The wait of the start for a sibling process to listen. Says on standard error what is waited for when that
-// takes long.
 #pragma once
 
 #include <chrono>
@@ -7,15 +5,18 @@
 
 class SocketRemoteSender;
 
+// Waits at the start until a sibling process listens. When this takes long, writes to standard error what it
+// waits for.
 class SiblingWait
 {
 public:
     static constexpr std::chrono::seconds QUIET{2};
 
-    // Client numbers of the siblings that are not connected yet.
+    // missing: client numbers of the siblings that are not connected yet.
     explicit SiblingWait(std::vector<long> missing);
 
-    // Blocks until the sender is connected to that client. False when this process is told to end first.
+    // Blocks until the sender is connected to the client. Returns false when this process is told to end
+    // before that.
     bool waitFor(SocketRemoteSender& sender, long client);
 
 private:

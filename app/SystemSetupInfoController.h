@@ -1,5 +1,3 @@
-// The link to the system set-up service: learns languages and model of the appliance right after connecting,
-// and tells of each change. GUI thread.
 #pragma once
 
 #include "app/ServiceLink.h"
@@ -7,6 +5,8 @@
 #include "messaging/services/ISystemSetupManager.h"
 #include "messaging/services/SystemSetupDef.h"
 
+// The link to the system set-up service: requests the languages and the model of the appliance after
+// connecting, and reports each change. GUI thread.
 class SystemSetupInfoController : public IInputLanguageSource,
                                   public ISystemSetupManagerCallBack,
                                   public ISystemSetupManagerNotify
@@ -19,13 +19,13 @@ public:
     static SystemSetupInfoController* getInstance();
     static void clearInstance();
 
-    // Blocks until the main process listens. Does nothing once the client id has arrived.
+    // Blocks until the main process listens. Does nothing if the client id was received before.
     void setFactory(TitlerToolFactory* factory);
 
-    // Tells the last known input language again, by signalsInputLanguageInfo.
+    // Reports the last known input language again with signalsInputLanguageInfo().
     void getInputLanguage();
     void getModuleInfo();
-    // Asks for the languages; the answer arrives as getLanguageInfoCallBack.
+    // Requests the languages; the answer arrives in getLanguageInfoCallBack().
     void getLanguageInfo();
 
     void getClientID(int id) override;

@@ -1,5 +1,3 @@
-// The object behind the service that this program offers: hands each call of a sibling to the controller that
-// answers for it, those that show something through EarlyRequests. GUI thread.
 #pragma once
 
 #include "messaging/services/ITitler.h"
@@ -7,6 +5,8 @@
 class EditContextController;
 class ShowMessageController;
 
+// Implements the service that this program offers: passes each call of a sibling process to the controller
+// responsible, through EarlyRequests if the call shows something. GUI thread.
 class Titler : public ITitler
 {
 public:

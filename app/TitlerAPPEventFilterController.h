@@ -1,5 +1,3 @@
-// The link to the lock service: announces touches and open controls of this process to the siblings, and
-// takes their announcements. GUI thread.
 #pragma once
 
 #include "app/ServiceLink.h"
@@ -7,6 +5,8 @@
 #include "messaging/services/IAPPEventFilter.h"
 #include "touchui/ITitlerAPPEventFilterController.h"
 
+// The link to the lock service: reports touches and open controls of this process to the sibling processes,
+// and receives their reports. GUI thread.
 class TitlerAPPEventFilterController : public ITitlerAPPEventFilterController,
                                        public IAPPEventFilterCallBack,
                                        public IAPPEventFilterNotify
@@ -22,7 +22,7 @@ public:
     void informRestoreOriginal(APPEventDefine::EventRevicer receiver) override;
 
     void setClientID(int id) override;
-    // Events that this process sent come back from the service; they are dropped.
+    // Called for each event. The service also returns the events of this process, which are ignored.
     void postAPPEventFilterNotify(APPEventDefine::_tagAPPEvent event) override;
     void postRestoreOriginalNotify(APPEventDefine::_tagAPPEvent event) override;
     void postRestoreFocusNotify() override;

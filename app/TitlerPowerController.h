@@ -1,4 +1,3 @@
-// The link to the power service. GUI thread.
 #pragma once
 
 #include <QObject>
@@ -6,13 +5,14 @@
 #include "app/ServiceLink.h"
 #include "messaging/services/IPowerManager.h"
 
+// The link to the power service. GUI thread.
 class TitlerPowerController : public QObject, public IPowerManagerCallBack, public IPowerManagerNotify
 {
     Q_OBJECT
 
 public:
     static TitlerPowerController* getInstance();
-    // Takes 5 seconds when connected: the time that the service needs to drop this client.
+    // Takes 5 seconds when connected, which is the time that the service needs to drop this client.
     static void clearInstance();
 
     void setFactory(TitlerToolFactory* factory);

@@ -1,4 +1,3 @@
-// The link to the project data service: loading a project may change the language. GUI thread.
 #pragma once
 
 #include <QObject>
@@ -6,6 +5,7 @@
 #include "app/ServiceLink.h"
 #include "messaging/services/IProjectDataManager.h"
 
+// The link to the project data service: the language may change when a project is loaded. GUI thread.
 class TitlerProjectDataController : public QObject,
                                     public IProjectDataManagerCallBack,
                                     public IProjectDataManagerNotify
@@ -19,7 +19,7 @@ public:
     void setFactory(TitlerToolFactory* factory);
 
     void getClientID(int id) override;
-    // Asks for the languages in the states 1 and 2, does nothing in any other.
+    // Requests the languages in the states 1 and 2; does nothing in any other state.
     void loadNotify(int state) override;
 
 private:

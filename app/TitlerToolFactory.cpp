@@ -64,7 +64,7 @@ PTC::ISender* TitlerToolFactory::serviceSender(long client, long port)
     return added;
 }
 
-// In the order of their keys backwards, which is that of the start: the sub panel comes first.
+// Sorted by descending key, which is the order of the start: the sub panel comes first.
 std::vector<long> TitlerToolFactory::missingSiblings()
 {
     std::map<long, long, std::greater<>> ports;
@@ -126,7 +126,7 @@ PTC::IProxyBase* TitlerToolFactory::createProxy(long type, long id, long client)
     return proxy;
 }
 
-// The process behind the key may have been started anew: then its old connection is of no use.
+// Connects again: the process of this key may have been restarted, which makes the old connection useless.
 PTC::ISender* TitlerToolFactory::callBackSender(long client)
 {
     const long key = ServiceTable::senderKeyOf(client);
@@ -139,7 +139,7 @@ PTC::ISender* TitlerToolFactory::callBackSender(long client)
     return findSender(key);
 }
 
-// A peer that asks again and again gets one line.
+// Logs repeated refusals of a client once.
 void TitlerToolFactory::reportRefusal(long client)
 {
     if (mLastRefusedClient == client)

@@ -1,8 +1,3 @@
-// Builds everything that talks to the siblings: the listener on port 1003 with the adapter of the service
-// that this program offers, the proxies of the services that it calls, and the callback adapters those need.
-// Owns the receiver, the senders and the service object; proxies and adapters live as long as the factory.
-//
-// GUI thread.
 #pragma once
 
 #include <memory>
@@ -20,35 +15,43 @@ class Proxy;
 class QtReceiver;
 } // namespace PTC
 
+// Makes all objects for communication with the sibling processes: the listener on port 1003 with the adapter
+// of the service that this program offers, the proxies of the services that it calls, and the adapters of
+// their callbacks. Owns the receiver, the senders and the service object; proxies and adapters exist as long
+// as the factory.
+//
+// GUI thread.
 class TitlerToolFactory : public PTC::InstanceFactory
 {
 public:
     static constexpr long TITLER_INTERFACE_ID = ITitler::INTERFACE_ID;
     static constexpr long TITLER_CALLBACK_INTERFACE_ID = ITitlerCallBack::ADAPTER_TYPE;
-    // Identity and listening port of this process.
+    // Client number and listening port of this process.
     static constexpr long TITLER_CLIENT_NUMBER = ServiceTable::TITLER_CLIENT;
     static constexpr long TITLER_RECEIVER_ID = ServiceTable::TITLER_CLIENT_KEY;
 
     TitlerToolFactory();
     ~TitlerToolFactory() override;
 
-    // Starts the listener. False when the port cannot be bound; the factory still makes proxies then, but no
-    // request reaches this process.
+    // Starts the listener. Returns false when the port cannot be bound: the factory still makes proxies, but
+    // no request reaches this process.
     bool initialize() override;
 
-    // Writes the proxy of a service to *out; an unknown id leaves it untouched. The first of each sibling
-    // blocks, without limit, until it accepts the connection; a request to end the process leaves *out
-    // untouched.
+    // Writes the proxy of a service to *out; leaves *out unchanged for an unknown id. The first call for a
+    // sibling blocks, without limit, until the sibling accepts the connection; if this process is told to end
+    // meanwhile, *out stays unchanged.
     void createInstance(long id, void** out) override;
 
-    // Takes over an implementation of ITitler in place of the own one; only for its id, and only the first.
+    // Takes ownership of an implementation of ITitler, which is used instead of the default one. Only the
+    // first object for its id is accepted.
     virtual void RegisterObject(long id, void* object);
 
     PTC::IAdapterBase* createAdapter(long type, PTC::IReceiver* receiver, void* target) override;
-    // Null for a client number that no sibling has, and when nobody listens there; does not wait.
+    // Returns null for a client number that is not that of a sibling, and when nobody listens there; does not
+    // wait.
     PTC::IProxyBase* createProxy(long type, long id, long client) override;
 
-    // createInstance with the interface's type: createInstance hands out the interface pointer as void*.
+    // Calls createInstance() and casts the result to the interface's type.
     template <typename Interface>
     Interface* createService()
     {
@@ -64,8 +67,8 @@ private:
     void reportRefusal(long client);
 
     std::unique_ptr<ITitler> mTitler;
-    PTC::QtReceiver* mReceiver = nullptr;              // owned by the remote receiver, which listens
-    std::unique_ptr<PTC::QtReceiver> mUnboundReceiver; // owns it instead when nothing listens
+    PTC::QtReceiver* mReceiver = nullptr;              // owned by the remote receiver while listening
+    std::unique_ptr<PTC::QtReceiver> mUnboundReceiver; // owns mReceiver when the port could not be bound
     std::vector<std::unique_ptr<PTC::IObject>> mProxies;
     long mNextAdapterId = 0;
     std::optional<long> mLastRefusedClient;

@@ -76,7 +76,7 @@ bool isBelowTitles(const QString& path)
 
 bool isGraphicsView(const QWidget* widget)
 {
-    // The point may lie on the view's viewport.
+    // The widget may be the viewport of the view.
     for (; widget; widget = widget->parentWidget()) {
         if (qobject_cast<const QGraphicsView*>(widget))
             return true;
@@ -84,7 +84,7 @@ bool isGraphicsView(const QWidget* widget)
     return false;
 }
 
-// What lies there is not ours to change or to clean up.
+// Files outside the title folders must not be changed or cleaned up.
 void logRefusedRequest(const QString& path)
 {
     ConfinedPath::logRefusal(L"a request asks for what lies outside: ", path.toStdString());
@@ -105,7 +105,7 @@ TitlerWindow::TitlerWindow(bool deferArchiveList, QWidget* parent)
 
     setWindowTitle(tr("Titler"));
     setGeometry(MAIN_RECT);
-    new WindowPlaceKeeper(this); // child of this
+    new WindowPlaceKeeper(this); // owned by this window
     QPalette windowPalette = palette();
     windowPalette.setColor(QPalette::Window, Qt::black);
     setPalette(windowPalette);
@@ -126,10 +126,10 @@ TitlerWindow::TitlerWindow(bool deferArchiveList, QWidget* parent)
 
 TitlerWindow::~TitlerWindow()
 {
-    // Events of children that are destroyed must not reach a window that is half destroyed.
+    // Prevents events of destroyed children from reaching a partly destroyed window.
     if (APPEventFilter* filter = APPEventFilter::instance())
         filter->unegisterEventFilter(this);
-    // The canvas must be gone before the service links that its workers report through.
+    // The canvas is deleted before the service links, through which its workers report.
     mUndoStack.clear();
     delete mFolderPicker;
     delete mTextToolsPanel;
@@ -189,7 +189,7 @@ QWidget* TitlerWindow::createArchiveList(bool deferArchiveList)
 {
     auto* pathLabel = new QLabel;
     pathLabel->setStyleSheet(QStringLiteral("color:rgb(220,220,220); text-align:left; font:28px;"));
-    // The lines of some families are higher, and the list under the row has a frame at a fixed place.
+    // Fixed, since lines are higher in some families, and the list below has a frame at a fixed place.
     pathLabel->setFixedHeight(TITLE_ROW_HEIGHT);
 
     mMoveMode = std::make_unique<MoveMode>(this);
@@ -240,10 +240,10 @@ void TitlerWindow::showEvent(QShowEvent* event)
 
 void TitlerWindow::hideEvent(QHideEvent* event)
 {
-    mCanvasScene->endPreview(); // the palette is a window of its own
+    mCanvasScene->endPreview(); // the palette is a separate window
     WINDOW_IS_SHOWN = false;
     if (!event->spontaneous()) {
-        // Whoever asked for a mask may take it away only later, or never.
+        // The process that requested a mask may remove it much later, or never.
         slotShowDialogMaskWidget(false);
         slotShowMessageMaskWidget(false);
         if (KSInputContext* context = mLinks->inputContext())
@@ -252,7 +252,7 @@ void TitlerWindow::hideEvent(QHideEvent* event)
     QMainWindow::hideEvent(event);
 }
 
-// A window manager's close is the operator's Close: the process lives on.
+// Treats a close by the window manager like the Close button, so the process continues.
 void TitlerWindow::closeEvent(QCloseEvent* event)
 {
     if (mSessionEnd.closesWindow()) {
@@ -303,7 +303,7 @@ bool TitlerWindow::eventFilter(QObject* obj, QEvent* event)
     return ignoreTouchEventWhenSliderIsShowing(obj, event);
 }
 
-// While the slider of the edge is open, fingers work nothing else.
+// Ignores touches of all other widgets while the slider of the edge is open.
 bool TitlerWindow::ignoreTouchEventWhenSliderIsShowing(QObject* obj, QEvent* event) const
 {
     switch (event->type()) {
@@ -322,7 +322,7 @@ bool TitlerWindow::ignoreMouseAndTouchEventWhenArchiveListIsMoveMode(QObject* ob
         return false;
     slotCancelArchiveListMoveMode();
     if (event->type() == QEvent::TouchBegin)
-        slotCancelArchiveListMoveMode(); // siblings hear of a finger twice
+        slotCancelArchiveListMoveMode(); // the siblings receive two reports for a touch
     return true;
 }
 
@@ -381,7 +381,7 @@ void TitlerWindow::refreshArchiveList(QString path)
         hide();
     } else if (!isBelowTitles(path) || (!info.isDir() && !isBelowTitles(path.left(slash)))) {
         logRefusedRequest(path);
-        hide(); // as for a path that does not exist
+        hide(); // same as for a path that does not exist
     } else if (info.isDir()) {
         mArchiveList->refreshArchiveList(path);
     } else {
@@ -394,7 +394,7 @@ void TitlerWindow::closeTitlerWindow()
 {
     mArchiveList->stopArchiveListTapAndHoldTimer();
     if (archiveListIsMoveMode())
-        slotCancelArchiveListMoveMode(); // what is being dragged gets its place while the folder is open
+        slotCancelArchiveListMoveMode(); // a dragged title gets its place while the folder is still open
     mArchiveList->slotHideOptionMenu();
     const QString path = mArchiveList->getCurrentPath();
     saveCurrentTitle();
@@ -407,7 +407,7 @@ void TitlerWindow::closeTitlerWindow()
     resetCanvasBackground();
     waitUntilSaved();
     if (mUnsavedWork.ask(*mLinks))
-        return; // continueCloseTitler follows with the answer
+        return; // continueCloseTitler() is called with the answer
 
     EditContextController* context = EditContextController::getInstance();
     if (mSessionEnd.asksFirst() && context->isMainNeedMsg()) {
@@ -437,15 +437,16 @@ void TitlerWindow::closeTitlerMainWindow()
     EditContextController::getInstance()->sentITitlerCallBack(path.toStdWString());
     EditContextController::getInstance()->setITitlerNoCallBack();
     mLinks->changeTopWindow(MessageDefine::TOP_WINDOW_MAIN);
-    // All files are in their place; the disk may take longer, but nobody waits for it.
+    // All files are renamed into place. Nobody waits for the disk to sync them; those that are not synced
+    // after the deadline are only logged.
     QTimer::singleShot(SYNC_DEADLINE, this, &UnsavedWork::logUnsynced);
 }
 
 void TitlerWindow::hideSession()
 {
-    mTemplatePicker->reject(); // an answered message may come while it is open
+    mTemplatePicker->reject(); // the answer to a message may arrive while it is open
     mFolderPicker->setCurrentFolderName(QString());
-    mToolsBar->hideCanvasMenu(); // a window of its own
+    mToolsBar->hideCanvasMenu(); // the menu is a separate window
     hide();
     mCanvasScene->clearCanvas();
     mArchiveList->cleanArchiveList();
@@ -458,7 +459,7 @@ void TitlerWindow::continueCloseTitler(MessageDefine::tagCloseParam param)
         return;
     if (mUnsavedWork.takeQuestion()) {
         if (param.closeType != MessageDefine::CLOSE_OK) {
-            // The session continues, but the siblings have been told that the folder is free.
+            // The session continues, although the siblings were told that the folder is free.
             mLinks->editFolderStarts(mArchiveList->getCurrentPath());
             return;
         }
@@ -481,14 +482,14 @@ void TitlerWindow::waitUntilSaved()
             LOG_DEBUG_OPERATE(L"TitlerWindow", LOG_NUMBER, L"pictures are still being written");
         mSavingNotice->hide();
     }
-    // The thread that writes the pictures reports them by way of this thread's events. Siblings hear of them
-    // before they hear of what follows, and before the process is gone.
+    // The picture thread posts its reports to this thread. Deliver them now, before later messages and before
+    // the process ends.
     mLinks->sendTitleReports();
 }
 
 void TitlerWindow::saveCurrentTitle()
 {
-    mGraphicsView->cancelTouch(); // an object that is being dragged is saved at its old place
+    mGraphicsView->cancelTouch(); // a dragged object is saved at its old place
     mCanvasScene->leaveTitle();
 }
 
@@ -496,12 +497,12 @@ void TitlerWindow::endProcess()
 {
     if (!mSessionEnd.beginEndOfProcess())
         return;
-    mFolderPicker->done(QDialog::Rejected); // a dialog with no Cancel would refuse the end
+    mFolderPicker->done(QDialog::Rejected); // closes the dialog even if its Cancel is disabled
     saveCurrentTitle();
     waitUntilSaved();
     UnsavedWork::giveUp();
     if (!KSInputContext::isSoftKeyboardClosed())
-        mLinks->simpleCloseSoftKeyboard(); // it would stay up without this process
+        mLinks->simpleCloseSoftKeyboard(); // otherwise the keyboard stays open after the process has ended
     close();
     QApplication::closeAllWindows();
     QCoreApplication::quit();
@@ -531,7 +532,8 @@ void TitlerWindow::openFolderDialog()
     mToolsBar->setFolderButtonRest();
 }
 
-// The folder that is open cannot take a new name in the picker, and renames by others are followed.
+// Marks the open folder in the picker: it cannot be renamed there, and renames by other processes are
+// followed.
 void TitlerWindow::markOpenFolder()
 {
     mFolderPicker->setCurrentFolderName(
@@ -587,7 +589,7 @@ void TitlerWindow::slotShowMessageMaskWidget(bool isShow)
 
 // --- Undo, and what the canvas and the list are asked for --------------------------------------------------
 
-// A change of the selected title at a clean stack leaves the stack clean.
+// Drops a change of the selected title while the stack is clean, so that the stack stays clean.
 void TitlerWindow::pushUndoStack(QUndoCommand* subUndoCommand)
 {
     if (mUndoStack.isClean() && subUndoCommand->id() == FOCUS_COMMAND_ID) {
@@ -620,7 +622,7 @@ void TitlerWindow::pressDelectButton()
     mLinks->dummyCloseSoftKeyboard();
 }
 
-// The checker shows the window's own picture behind the canvas.
+// The checker pattern is part of the window's own picture behind the canvas.
 void TitlerWindow::slotCanvasButtonClicked(QAction*)
 {
     update();
@@ -652,7 +654,8 @@ void TitlerWindow::leaveTextEditing(bool deleteEmptyItems)
 
 void TitlerWindow::slotDeleteEmptyItems()
 {
-    // Over the canvas lies the viewport of its view: a tap beside a text that was left empty takes that away.
+    // widgetAt() returns the viewport of a view, not the view itself. So a tap on the canvas beside an empty
+    // text deletes the text.
     if (!qobject_cast<QGraphicsView*>(QApplication::widgetAt(QCursor::pos())))
         mCanvasScene->slotDeleteEmptyItems();
 }
@@ -666,7 +669,7 @@ bool TitlerWindow::archiveListIsMoveMode() const
 
 void TitlerWindow::editAndDoneButtonClicked()
 {
-    // What is being composed goes into the text before that is left.
+    // Commits the input method's text before editing ends.
     if (KSInputContext* context = mLinks->inputContext())
         context->sendEvent(QInputMethodEvent());
     KSPushbutton* button = mMoveMode->button();
@@ -706,7 +709,7 @@ void TitlerWindow::moveButtonReleased()
 
 // --- Lock reporting -------------------------------------------------------------------------------------
 
-// Reports to the siblings that a control which closes on a press elsewhere is open, or closed again.
+// Reports to the siblings that a control that closes on a press elsewhere was opened or closed.
 void TitlerWindow::sendTransientControlEvent(bool on)
 {
     mLinks->sendAPPEvent(APPEventDefine::LOCKTYPE_OBJECT, on);

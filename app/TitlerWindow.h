@@ -1,9 +1,3 @@
-// The main window and the hub of the program: owns every visible object, makes every connection between them
-// and to the controllers, and keeps the session from a request to its answer. Built hidden and kept hidden
-// between sessions; closing hides it and empties canvas and list, nothing is rebuilt on the next show.
-//
-// Window coordinates: 1920 x 1080, the canvas view of 1280 x 720 at (609, 97).
-// GUI thread only. The constructor blocks until both sibling processes listen.
 #pragma once
 
 #include <QMainWindow>
@@ -41,6 +35,12 @@ class ToolsBar;
 class WindowDialogs;
 class WindowMasks;
 
+// The main window and centre of the program: owns all widgets, makes the connections between them and to the
+// controllers, and controls a session from the request to the answer. It is built hidden and hidden between
+// sessions; closing it hides it and empties canvas and list, and showing it again builds nothing.
+//
+// Window coordinates: 1920 x 1080, with the canvas view of 1280 x 720 at (609, 97).
+// GUI thread only. The constructor blocks until both sibling processes listen.
 class TitlerWindow : public QMainWindow, public ICanvasHost
 {
     Q_OBJECT
@@ -52,22 +52,22 @@ public:
     static const QRect VSEPARATOR_RECT;
     static const QRect HSEPARATOR_TOP_RECT;
     static const QRect HSEPARATOR_BOTTOM_RECT;
-    static const QRect TEXT_PROPERTY_RECT; // presses in here do not end text editing
+    static const QRect TEXT_PROPERTY_RECT; // presses in this area do not end text editing
     static const int ARCHIVELISTWIDGET_WIDTH;
     static const double OPACITY_VALUE;
 
-    // deferArchiveList leaves the list empty until a request names a folder.
+    // Builds the window. With deferArchiveList the list stays empty until a request names a folder.
     TitlerWindow(bool deferArchiveList, QWidget* parent);
     ~TitlerWindow() override;
 
     bool windowIsVisible() const override { return WINDOW_IS_SHOWN; }
 
-    // Returns whether nothing of the canvas is still on its way to disk.
+    // Returns whether all changes on the canvas are written to disk.
     bool dataSaveIsFinished();
 
-    // Puts what is being edited on its way to disk, as leaving the title does.
+    // Commits what is being edited and saves the title, as when another title is selected.
     void saveCurrentTitle();
-    // Blocks, and says so on the window, until all pictures are in their place. Gives up when the disk hangs.
+    // Blocks until all pictures are written, and shows a notice meanwhile. Gives up when the disk hangs.
     void waitUntilSaved();
 
     bool archiveListIsMoveMode() const;
@@ -79,50 +79,50 @@ Q_SIGNALS:
     void signalHideEdgeSlider();
 
 public Q_SLOTS:
-    // Closing.
+    // Closing
     void closeTitlerWindow();
     void continueCloseTitler(MessageDefine::tagCloseParam param);
     void closeTitlerMainWindow();
     void slotPowerOff() { endProcess(); }
     void setRealClose(bool realClose) { mSessionEnd.setQuits(realClose); }
-    // Saves, waits until all is written, and ends the event loop.
+    // Saves, waits until everything is written, and ends the event loop.
     void endProcess();
 
-    // Showing. Requests for a visible window are dropped whole.
+    // Showing. Requests are ignored while the window is visible.
     void showTitlerWindow(titler_paramter paramter);
     void refreshArchiveList(QString path);
-    // Modal; return when a folder is open or the operator has cancelled. The second comes from the running
-    // editor, to which Cancel goes back.
+    // Modal; return when a folder is open or the operator has cancelled. openFolderDialog() is used while a
+    // title is edited: after Cancel editing continues.
     void showFolderDialog();
     void openFolderDialog();
     void slotCancelClicked();
-    // Modal; return when the operator has chosen a template or cancelled. The second begins with the
-    // operator's own templates.
+    // Modal; return when the operator has picked a template or cancelled. showTemplateDialogOnUser() opens
+    // the tab of the user templates.
     void showTemplateDialog();
     void showTemplateDialogOnUser();
 
-    // Undo.
-    void pushUndoStack(QUndoCommand* subUndoCommand); // takes over the command
+    // Undo
+    void pushUndoStack(QUndoCommand* subUndoCommand); // takes ownership
     void clearUndoStack();
 
-    // Leaving text editing.
+    // Leaving text editing
     void hideSoftWareWithDeleteEmptyItems() { leaveTextEditing(true); }
     void hideSoftWareWithOutDeleteEmptyItems() { leaveTextEditing(false); }
     void slotDeleteEmptyItems();
 
-    // Move mode.
+    // Move mode
     void editAndDoneButtonClicked();
     void slotChangeDoneToMoveMode();
     void slotCancelArchiveListMoveMode();
     void moveButtonPressed();
     void moveButtonReleased();
 
-    // Language and module.
+    // Language and module
     void slotSystemLanguageChanged(SystemSetupDef::emSystemLanguageType systemLanguage);
     void slotInputLanguageChanged(SystemSetupDef::emInputLanguageType inputLanguage);
     void slotGetModuleInfo(SystemSetupDef::emInformationModel moduleInfo);
 
-    // Forwarders.
+    // Forwarding
     void slotNewTextButtonClicked();
     void pressDelectButton();
     void slotCanvasButtonClicked(QAction* action);
@@ -134,7 +134,7 @@ public Q_SLOTS:
     }
     void setHasMessageToShowInformation(bool isNeedShow, QString defaultFont);
 
-    // Lock reporting. The siblings hear of controls that close on a press elsewhere.
+    // Lock reporting: the siblings are told of controls that close on a press elsewhere
     void slotShowEdgeSlider(bool isShow) { sendTransientControlEvent(isShow); }
     void slotShowCanvasMenu(bool isShow) { sendTransientControlEvent(isShow); }
     void slotShowFontFamilyComboxList(bool isShow) { sendTransientControlEvent(isShow); }
@@ -193,7 +193,7 @@ private:
 
     static bool WINDOW_IS_SHOWN;
 
-    // Owned by Qt parents.
+    // Owned by their Qt parents.
     ToolsBar* mToolsBar = nullptr;
     CanvasScene* mCanvasScene = nullptr;
     GraphicsView* mGraphicsView = nullptr;
@@ -213,9 +213,9 @@ private:
 
     SessionEnd mSessionEnd;
     UnsavedWork mUnsavedWork;
-    std::optional<QString> mMissingFont; // to be reported when the window shows
+    std::optional<QString> mMissingFont; // reported when the window is shown
     SystemSetupDef::emInformationModel m_emModuleInfo = SystemSetupDef::emInformationModelDefault;
 };
 
-// The one main window; null before it is built and after it is deleted.
+// The main window; null before it is built and after it is deleted.
 extern TitlerWindow* pMainWindow;

@@ -1,5 +1,5 @@
-// Every connection between the objects that the window owns, and to the controllers. No canvas, panel or
-// library object connects to another by itself.
+// All connections between the objects that the window owns, and to the controllers. No object of canvas,
+// panel or library connects itself to another one.
 #include "app/TitlerWindow.h"
 
 #include "app/EditContextController.h"
@@ -86,7 +86,7 @@ void TitlerWindow::connectForTextToolsAndArchiveList()
 
 void TitlerWindow::connectForTextToolsPanel()
 {
-    // What is selected is shown.
+    // The selection is shown in the panel.
     connect(mCanvasScene, &CanvasScene::signalSceneNotifyIfExistSelectedObject, mTextToolsPanel,
             &TextToolsPanel::changeFontPropertyBtnStatus);
     connect(mCanvasScene, &CanvasScene::signalNotifyPropertyAreaUpdateCurrentTextStyle, mTextToolsPanel,
@@ -98,14 +98,14 @@ void TitlerWindow::connectForTextToolsPanel()
     connect(mCanvasScene, &CanvasScene::signalSceneSoftWareClosedWhenEditObject, mTextToolsPanel,
             &TextToolsPanel::slotHideColorPaletteWhenCloseSoftWare);
     connect(mCanvasScene, &CanvasScene::signalEndPreview, mTextToolsPanel, &TextToolsPanel::slotEndPreview);
-    // What is changed goes to the canvas.
+    // Changes in the panel are sent to the canvas.
     connect(mTextToolsPanel, &TextToolsPanel::signalNotifyEditAreaSizeToolBoxEditDone, mCanvasScene,
             &CanvasScene::slotNotifyEditAreaSizeToolBoxEditDone);
     connect(mTextToolsPanel, &TextToolsPanel::textStyleChange, mCanvasScene,
             &CanvasScene::slotChangeObjectTextStyle);
     connect(mTextToolsPanel, &TextToolsPanel::signalUpdateCurrentTextProperty, mCanvasScene,
             &CanvasScene::slotUpdateCurrentTextProperty);
-    // Controls that are open for the moment, fonts and places.
+    // Transient controls, fonts and positions.
     connect(mTextToolsPanel, &TextToolsPanel::signalShowEdgeSlider, this, &TitlerWindow::slotShowEdgeSlider);
     connect(mToolsBar, &ToolsBar::signalShowCanvasMenu, mTextToolsPanel,
             &TextToolsPanel::slotAbsoluteShowCanvasMenu);
@@ -179,7 +179,7 @@ void TitlerWindow::connectForController()
     connectForTemplateNotices();
 }
 
-// A finger in another process closes what is open for the moment.
+// Closes transient controls when a finger comes down in another process.
 void TitlerWindow::connectForRestoreOriginal()
 {
     const auto* events = TitlerAPPEventFilterController::getInstance();

@@ -35,7 +35,7 @@ constexpr int MENU_TEXT_INDENT = 12;
 const char LABEL_STYLE[] = "background-color:transparent; color:rgb(220, 220, 220); font:20px;";
 const char LABEL_DISABLED_STYLE[] = "background-color:transparent; color:rgb(102, 102, 102); font:20px;";
 
-// Nothing behind the icon at rest and while disabled.
+// No background at rest and while disabled.
 const char BUTTON_IMAGES[] =
     "ToolsBar_Buttons::::"
     "Button_67_Pressed_Left:Button_67_Pressed_Center:Button_67_Pressed_Right::::"
@@ -101,8 +101,8 @@ void ToolsBar::createButtons()
 void ToolsBar::createMenu()
 {
     m_menu = new QMenu(this);
-    // No popup: while one is open Qt delivers no touches, and the finger that opened it by sliding off its
-    // button would never be lifted.
+    // Not a popup: Qt delivers no touches while one is open, so a finger that opened it by sliding off the
+    // button would never be released.
     m_menu->setWindowFlags(Qt::ToolTip | Qt::FramelessWindowHint | Qt::NoDropShadowWindowHint |
                            Qt::WindowDoesNotAcceptFocus);
     m_menu->setAttribute(Qt::WA_TranslucentBackground);
@@ -190,7 +190,7 @@ void ToolsBar::translateText()
     m_menu->update();
 }
 
-// Taps.
+// Taps
 
 void ToolsBar::clickedFolderButton()
 {
@@ -239,7 +239,7 @@ void ToolsBar::clickedSafeAreaButton()
     Q_EMIT SafeAreaButtonClickedForDrawRect(m_safeAreaShown);
 }
 
-// Also removes what was drawn on the canvas.
+// Switches the safe area off, also on the canvas.
 void ToolsBar::resetSafeArea()
 {
     const bool wasShown = m_safeAreaShown;
@@ -250,7 +250,7 @@ void ToolsBar::resetSafeArea()
     }
 }
 
-// States.
+// States
 
 void ToolsBar::setToolEnabled(const ToolButton& tool, bool enabled)
 {
@@ -260,8 +260,8 @@ void ToolsBar::setToolEnabled(const ToolButton& tool, bool enabled)
         tool.button->setEnabled(true);
         tool.button->changeButtonState(KSPushbutton::ButtonRest);
     } else {
-        // Others keep their touches: a step that is pushed by a timer disables Redo while anything may be
-        // touched.
+        // The other buttons keep their touches: a timer that pushes an undo step disables Redo at any time,
+        // even while a finger is on another widget.
         if (tool.button->isDown() || tool.button == m_text.button) {
             setPushButtonDisabled(tool.button);
         } else {
@@ -271,7 +271,8 @@ void ToolsBar::setToolEnabled(const ToolButton& tool, bool enabled)
     }
 }
 
-// A button that disables itself under the finger never sees the end of the touch, which it still holds.
+// Unlocks the touch gate: a button that is disabled under the finger does not receive the end of the touch
+// and would keep the lock.
 void ToolsBar::setPushButtonDisabled(QPushButton* button)
 {
     button->setEnabled(false);
@@ -331,7 +332,7 @@ void ToolsBar::slotlCanvasSceneMousePressed()
 {
 }
 
-// Looks.
+// Looks
 
 bool ToolsBar::isSelected(const ToolButton& tool) const
 {
@@ -350,7 +351,7 @@ void ToolsBar::showReleased(const ToolButton& tool)
                                                     : KSPushbutton::ButtonRest);
 }
 
-// The Canvas menu.
+// The Canvas menu
 
 void ToolsBar::showCanvasMenu()
 {
@@ -409,7 +410,7 @@ bool ToolsBar::paintCanvasMenu(QEvent* event)
     case QEvent::Resize: {
         DrawBoundingRectangle background;
         m_menuBackground = background.paintBoundingRectangle(MENU_BACKGROUND_KIND);
-        m_menu->setMask(m_menuBackground.mask()); // black corners without a compositor
+        m_menu->setMask(m_menuBackground.mask()); // otherwise the corners are black without a compositor
         return false;
     }
     case QEvent::Paint: {

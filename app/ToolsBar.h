@@ -19,7 +19,7 @@ class QPainter;
 class QPushButton;
 
 // The row of touch buttons above the canvas: Folder, New Text, Delete, Undo, Redo, Safe Area, Canvas, Close.
-// It reports taps as signals and knows nothing of what they do, but for its own looks and the small Canvas
+// It reports taps as signals and does not know what they do, apart from its own looks and the small Canvas
 // menu.
 class ToolsBar : public QWidget
 {
@@ -32,16 +32,16 @@ public:
     static constexpr int BTNS_TEXTLABEL_WIDTH = 120;
     static const QColor TRANSPARENT_COLOR;
 
-    // The actions of the undo stack; not owned, and they must outlive the bar.
+    // undo and redo: the actions of the undo stack; not owned, they must outlive the bar.
     ToolsBar(QAction* undo, QAction* redo, QWidget* parent);
     ~ToolsBar() override;
 
     bool eventFilter(QObject* obj, QEvent* event) override;
 
     void setFolderButtonEnabled(bool enabled);
-    // Folder looks at rest again, after a dialog swallowed its release.
+    // Resets the look of Folder, since the dialog that it opened has received its release.
     void setFolderButtonRest();
-    // Delete, Undo and Redo show disabled until the next change; the safe area is off.
+    // Shows Delete, Undo and Redo disabled until the next change, and switches the safe area off.
     void resetToDefaultState();
     void hideCanvasMenu();
     void translateText();
@@ -61,7 +61,7 @@ Q_SIGNALS:
     void deleteButtonClick();
     void SafeAreaButtonClicked();
     void SafeAreaButtonClickedForDrawRect(bool isOK);
-    // One of the three menu actions, with data 0 black, 1 white, 2 checker.
+    // Emitted for one of the three menu actions, with data 0 black, 1 white, 2 checker.
     void canvasButtonClicked(QAction* action);
     void exeUndoAction();
     void exeRedoAction();
@@ -87,7 +87,7 @@ private:
     struct ToolButton {
         KSPushbutton* button = nullptr;
         QLabel* label = nullptr;
-        // Kept: each icon that is made anew leaves its renderings in the application's cache.
+        // Kept, since each new icon leaves its rendered pictures in the application's cache.
         QIcon icon;
         QIcon disabledIcon;
     };
@@ -101,7 +101,7 @@ private:
     void setToolEnabled(const ToolButton& tool, bool enabled);
     void setPushButtonDisabled(QPushButton* button);
     void resetSafeArea();
-    // The looks under a finger and after it. The safe area stays selected while it is drawn.
+    // Set the look of a pressed and a released button. Safe Area stays selected while the lines are shown.
     void showPressed(const ToolButton& tool);
     void showReleased(const ToolButton& tool);
     bool isSelected(const ToolButton& tool) const;
@@ -130,6 +130,6 @@ private:
     QPixmap m_menuBackground;
     QPixmap m_menuCursor;
     QPixmap m_menuSeparator;
-    int m_menuItem = -1; // under the finger
+    int m_menuItem = -1; // item under the finger
     bool m_safeAreaShown = false;
 };

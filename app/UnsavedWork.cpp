@@ -52,7 +52,7 @@ void UnsavedWork::giveUp()
         logPath("lost, not saved: ", file.path);
         RefusedWrites::forget(file.path);
     }
-    SaveOutage::instance()->retry(); // which ends it
+    SaveOutage::instance()->retry(); // ends the outage
 }
 
 void UnsavedWork::logUnsynced()

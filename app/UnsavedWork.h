@@ -2,20 +2,20 @@
 
 class SiblingLinks;
 
-// What could not be saved by the end of a session, and the question to the operator whether it may be lost.
-// GUI thread.
+// The work that could not be saved by the end of a session, and the question to the operator whether it may
+// be lost. GUI thread.
 class UnsavedWork
 {
 public:
-    // Tries once more to save what the disk has refused. Asks the operator whether the rest may be lost and
-    // returns true when there is any and the question can be shown.
+    // Retries the refused writes. If some are left, asks the operator whether they may be lost; returns
+    // whether the question is shown.
     bool ask(SiblingLinks& links);
-    // Returns whether the operator has been asked, and forgets that.
+    // Returns whether the operator was asked, and resets that.
     bool takeQuestion();
 
-    // Tries once more to save, then gives up what the disk still refuses. The log names each file.
+    // Retries the refused writes, then drops those that fail again and logs each file.
     static void giveUp();
-    // Logs the files that have been saved but may not have reached the disk yet; the first of many.
+    // Logs the files that are saved but may not be synced to the disk yet; of many only the first.
     static void logUnsynced();
 
 private:

@@ -9,7 +9,7 @@
 namespace
 {
 
-// Kinds of frames.
+// Kinds of frames, see DrawBoundingRectangle.
 constexpr int WINDOW_FRAME = 1;
 constexpr int LEFT_FRAME = 2;
 constexpr QPoint WINDOW_FRAME_POS(8, 8);

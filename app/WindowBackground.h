@@ -5,14 +5,14 @@
 
 class QPainter;
 
-// What the window paints behind its widgets: two frames, the surround of the canvas and the separators.
-// Coordinates are the window's. GUI thread.
+// Paints the window behind its widgets: two frames, the surround of the canvas and the separators. Window
+// coordinates. GUI thread.
 class WindowBackground
 {
 public:
-    // Makes the frames anew, for a window that has changed its size.
+    // Makes the frames again. Call when the size of the window has changed.
     void makeFrames();
-    // Pictures are loaded at the first call.
+    // Loads the pictures at the first call.
     void paint(QPainter& painter);
 
 private:

@@ -12,8 +12,8 @@
 namespace
 {
 
-// Sent to the window around the template dialog; registered once, since a second registration gives another
-// number.
+// Returns the type of an event that is sent to the window before or after the template dialog. Called once
+// per type, since registering it again would give another number.
 QEvent::Type userEvent(int wanted)
 {
     return static_cast<QEvent::Type>(QEvent::registerEventType(wanted));
@@ -31,7 +31,7 @@ QEvent::Type templateDialogEnds()
     return type;
 }
 
-// The finger that opened the dialog does not come up in the widget under it.
+// Cancels the touch that opened the dialog, so that its release does not reach the widget below it.
 void APPEventFilterUnlock()
 {
     if (APPEventFilter* filter = APPEventFilter::instance())
@@ -73,7 +73,7 @@ bool WindowDialogs::takeOpenedFromEditor()
 
 void WindowDialogs::showTemplateDialog()
 {
-    if (m_templatePicker->isVisible()) // a second request for what is open already
+    if (m_templatePicker->isVisible()) // another request may arrive while it is open
         return;
     APPEventFilterUnlock();
     m_masks->setOpacityMaskVisible(true);
@@ -94,8 +94,7 @@ void WindowDialogs::showTemplateDialog()
         return;
     }
     m_folderPicker->showOpacityWidget(false);
-    // Without a template the operator is back in the folder picker, which stays open over the darkened
-    // window.
+    // If no template was picked, the folder picker stays open above the darkened window.
     if (!m_templatePicker->isSelectedItem())
         m_folderPicker->setKeepFolderDialog();
 }

@@ -5,26 +5,26 @@ class QWidget;
 class TemplatePicker;
 class WindowMasks;
 
-// Shows the folder picker and the template picker over the darkened window, and knows from where the folder
-// picker was opened. GUI thread.
+// Shows the folder picker and the template picker above the darkened window, and remembers whether the folder
+// picker was opened by a request or from the editor. GUI thread.
 class WindowDialogs
 {
 public:
-    // None is owned, and all outlive this object.
+    // None of them is owned; all must outlive this object.
     WindowDialogs(QWidget* window, WindowMasks* masks, FolderPicker* folderPicker,
                   TemplatePicker* templatePicker);
 
-    // Sets the buttons of the folder picker as a session begins with them.
+    // Sets the buttons of the folder picker to their state at the start of a session.
     void initFolderPicker();
 
-    // Modal: returns when the dialog closes. Does nothing while it is open.
+    // Modal: returns when the dialog is closed. Does nothing while it is open.
     void showFolderDialog();
-    // Notes that the editor opens the folder picker: Cancel leads back to the title that is still open.
+    // Notes that the folder picker is opened from the editor: after Cancel the title stays open.
     void noteOpenedFromEditor() { m_origin = FolderDialogOrigin::Editor; }
-    // Returns whether the editor has opened the folder picker, and forgets that.
+    // Returns whether the folder picker was opened from the editor, and resets that.
     bool takeOpenedFromEditor();
 
-    // Modal: returns when the dialog closes. Does nothing while it is open.
+    // Modal: returns when the dialog is closed. Does nothing while it is open.
     void showTemplateDialog();
 
 private:

@@ -19,7 +19,8 @@ bool WindowLanguage::switchTranslator(SystemSetupDef::emSystemLanguageType langu
     }
     const bool isChinese = language == SystemSetupDef::emSystemLanguageChinese;
     const QString file = m_folder + (isChinese ? QStringLiteral("cn.qm") : QStringLiteral("en.qm"));
-    // Loading empties the translator first, also when it fails: the language of before has to stay.
+    // A failed load empties the translator, so another one tries the file first, to keep the previous
+    // language.
     if (QTranslator probe; !probe.load(file) || !m_translator->load(file))
         return false;
     QCoreApplication::installTranslator(m_translator);

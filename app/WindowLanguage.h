@@ -6,7 +6,7 @@
 #include <QString>
 #include <QTranslator>
 
-// The language of the program's texts: its translation and its font family. GUI thread.
+// The language of the program's texts: translation and font family. GUI thread.
 class WindowLanguage
 {
 public:
@@ -15,13 +15,13 @@ public:
     WindowLanguage(const WindowLanguage&) = delete;
     WindowLanguage& operator=(const WindowLanguage&) = delete;
 
-    // Loads the translation of the language and installs it in the application. Returns whether it did: when
-    // the file cannot be loaded, the language of before stays.
+    // Loads the translation of the language and installs it in the application. Returns false when the file
+    // cannot be loaded; the previous language is kept then.
     bool switchTranslator(SystemSetupDef::emSystemLanguageType language);
 
     static QString fontFamily(SystemSetupDef::emSystemLanguageType language);
 
 private:
-    QPointer<QTranslator> m_translator; // made at first use, a child of the application
+    QPointer<QTranslator> m_translator; // made at first use; a child of the application
     QString m_folder;
 };

@@ -7,17 +7,17 @@ class QWidget;
 class TemplatePicker;
 class TextToolsPanel;
 
-// All that darkens the window: what lies behind its own dialogs, and the masks that siblings ask for while
-// they show a dialog or a message box. Such a mask also lies on the topmost dialog of this program that is
-// open. GUI thread.
+// Darkens the window behind its own dialogs, and shows the masks that sibling processes request while they
+// show a dialog or a message box. Such a mask also covers the topmost open dialog of this program. GUI
+// thread.
 class WindowMasks
 {
 public:
-    // None is owned, and all outlive this object.
+    // None of them is owned; all must outlive this object.
     WindowMasks(QWidget* window, TextToolsPanel* panel, FolderPicker* folderPicker,
                 TemplatePicker* templatePicker);
 
-    // Darkens the window behind a dialog of its own.
+    // Shows or hides the mask behind the window's own dialogs.
     void setOpacityMaskVisible(bool visible);
 
     void showDialogMaskWidget(bool show);

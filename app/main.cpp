@@ -25,27 +25,27 @@ constexpr int RIGHT_WINDOW_LEFT = 1280;
 constexpr std::chrono::seconds SYNC_DEADLINE(10);
 constexpr int LOG_NUMBER = 400;
 
-// Called in the GUI thread when the process is told to stop.
+// Called in the GUI thread when a signal tells the process to end.
 void onSystemSingleCaught()
 {
     if (pMainWindow)
         pMainWindow->endProcess();
 }
 
-// The process runs all day and renders a few large pictures at a time: those go back to the system at once
-// instead of stretching the heaps of the GUI and picture threads for good.
+// Returns large blocks to the system at once. The process runs all day and renders a few large pictures at a
+// time, which would otherwise enlarge the heaps of the GUI and picture threads permanently.
 void keepMemoryFlat()
 {
     constexpr int LARGE_BLOCK = 256 * 1024;
     constexpr int HEAPS = 2;
-    constexpr int SMALL_PICTURES = 1024; // kB; what is large is kept where it is shown
+    constexpr int SMALL_PICTURES = 1024; // kB; widgets keep larger pictures themselves
     mallopt(M_MMAP_THRESHOLD, LARGE_BLOCK);
     mallopt(M_TRIM_THRESHOLD, LARGE_BLOCK);
     mallopt(M_ARENA_MAX, HEAPS);
     QPixmapCache::setCacheLimit(SMALL_PICTURES);
 }
 
-// The files are in their place; what becomes of them when the power goes now nobody knows.
+// Logs the files that are written but not synced, which a power failure may still destroy.
 void logUnsynced()
 {
     for (const std::string& path : FileSyncQueue::unsynced())
@@ -69,7 +69,7 @@ int main(int argc, char* argv[])
     KSInputContext::install();
     QApplication application(argc, argv);
     application.setObjectName(QStringLiteral("Titler"));
-    // The process outlives its window: hiding or closing a window must not end it by itself.
+    // The process must not end when its window is hidden or closed.
     QApplication::setQuitOnLastWindowClosed(false);
 
     APPEventFilter::instance();

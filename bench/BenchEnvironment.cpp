@@ -8,7 +8,7 @@
 namespace
 {
 
-// Away from the fixed ports and from the range that the system hands out to clients.
+// Outside the fixed ports and the range that the system assigns to clients.
 constexpr int FIRST_PORT_OFFSET = 10000;
 constexpr int PORT_OFFSETS = 2000;
 constexpr int PORTS_OF_ONE_RUN = 8;

@@ -14,8 +14,8 @@ namespace
 
 constexpr int CHARACTERS_A_WORD = 6;
 constexpr int CHARACTERS_A_LINE = 40;
-constexpr int FIRST_NUMBER = 100;    // of three digits
-constexpr std::size_t EXTENSION = 4; // of ".xml"
+constexpr int FIRST_NUMBER = 100;    // the first number with three digits
+constexpr std::size_t EXTENSION = 4; // length of ".xml"
 constexpr QSize SMALL_PICTURE(240, 135);
 constexpr int FOLDER_TITLE_CHARACTERS = 40;
 constexpr std::array COLORS = {"#FFFFFF", "#FFD24D", "#8FE3FF", "#FF6060"};

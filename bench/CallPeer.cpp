@@ -20,7 +20,7 @@
 namespace
 {
 
-constexpr long RAW_PEER = 1002; // client number whose port the raw peer takes
+constexpr long RAW_PEER = 1002; // client number whose port the raw peer uses
 
 void announceReady()
 {

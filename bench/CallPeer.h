@@ -1,4 +1,4 @@
-// The other process of the messaging benchmark, and the factory that both sides build their end with.
+// The peer process of the messaging benchmark, and the factory that both processes use.
 #pragma once
 
 #include "messaging/ptc/InstanceFactory.h"
@@ -12,7 +12,7 @@ class IAdapterBase;
 class ISender;
 } // namespace PTC
 
-// Listens under a client number and connects where it is told to.
+// Listens under a client number and connects to another one on request.
 class CallFactory : public PTC::InstanceFactory
 {
 public:
@@ -20,26 +20,26 @@ public:
     static constexpr long CALLER = 1000; // client numbers
     static constexpr long PEER = 1003;
 
-    // Takes the adapter over; callback says in which table it goes.
+    // Takes ownership of the adapter; callback selects the table that it is entered in.
     bool listen(long client, PTC::IAdapterBase* adapter, bool callback);
-    // A connection to that client; null when nobody listens there.
+    // Returns a connection to the client; null when nobody listens there.
     PTC::ISender* connectTo(long client);
 
-    // Makes nothing: both sides know their only service.
+    // Does nothing: both processes know their only service.
     void createInstance(long id, void** instance) override;
     PTC::IAdapterBase* createAdapter(long type, PTC::IReceiver* receiver, void* target) override;
-    // Connects to whoever registers a callback.
+    // Connects to a client that registers a callback.
     PTC::IProxyBase* createProxy(long type, long id, long client) override;
 };
 
-// Answers every request for titles at once with an empty result.
+// Answers every request for titles with an empty result.
 class CallPeer : public ITitler
 {
 public:
     CallPeer();
     ~CallPeer() override;
 
-    // Serves until the process is ended; prints a line when it listens. The exit code.
+    // Serves until the process is ended; prints a line when it listens. Returns the exit code.
     int run();
 
     void registerCallBack(ITitlerCallBack* callBack) override;
@@ -53,17 +53,18 @@ private:
     std::unique_ptr<ITitlerCallBack> mCallBack;
 };
 
-// Takes whole frames on one socket, acknowledges each and sends it back: what the wire costs without the
+// Receives whole frames on one socket, acknowledges each and sends it back: measures the wire without the
 // framework.
 class RawPeer
 {
 public:
-    // As CallPeer::run.
+    // Same as CallPeer::run().
     static int run();
 
-    // One frame there and back, with both acknowledgements. False when the connection is gone.
+    // Sends one frame and receives it back, with both acknowledgements. Returns false when the connection is
+    // closed.
     static bool exchange(int socket, char* frame);
-    // Connects to the peer; -1 when that fails.
+    // Connects to the peer and returns the socket; -1 when that fails.
     static int connectToPeer();
 
 private:

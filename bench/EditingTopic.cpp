@@ -1,4 +1,4 @@
-// Edits of a text of 300 characters on the canvas: a frame of a drag, a change of style, its undo.
+// Edits of a text of 300 characters on the canvas: one frame of a drag, a change of style, its undo.
 #include "bench/BenchTitles.h"
 #include "bench/PairList.h"
 #include "bench/Topics.h"
@@ -29,7 +29,7 @@ constexpr int STEP = 6; // pixels that the finger moves in one frame
 constexpr int OBJECT = 1;
 const QSize CANVAS(1280, 720);
 
-// Updates that the scene has put off, and the paint event of the view.
+// Carries out the queued updates of the scene and the paint event of the view.
 void show(QGraphicsView& view)
 {
     QCoreApplication::processEvents();
@@ -56,8 +56,8 @@ void mouse(QGraphicsView& view, QEvent::Type type, QPoint point)
     QCoreApplication::sendEvent(view.viewport(), &event);
 }
 
-// The object on the canvas as the window shows it, with its undo stack. There is no title around it, so steps
-// are not saved: that has a pair of its own.
+// The object on the canvas with its undo stack, as in the window. It is not part of a title, so undo steps
+// are not saved: another pair measures saving.
 struct Canvas {
     explicit Canvas(const BenchTitles::Look& look)
     {
@@ -83,7 +83,7 @@ constexpr BenchTitles::Look OutlinedText{
 constexpr BenchTitles::Look PlainText{
     .characters = CHARACTERS, .size = 48, .edgeWidth = 0, .shadow = false, .mixed = true};
 
-// One object of the canvas dragged to and fro by a finger that is down already.
+// Measures dragging an object of the canvas to and fro with a finger that is down already.
 void drag(benchmark::State& state, QGraphicsView& view, QPoint from, const std::function<QPointF()>& place)
 {
     mouse(view, QEvent::MouseButtonPress, from);
@@ -131,7 +131,7 @@ void dragPixmap(benchmark::State& state)
          [item] { return item->scenePos(); });
 }
 
-// What the panel sends: the styles of the selection, all bold or none.
+// Returns the styles of the selection as the panel sends them, with all characters bold or none.
 TText withBold(const TText& record, bool bold)
 {
     TText source = record;
@@ -182,10 +182,10 @@ void undoStyle(benchmark::State& state)
     }
 }
 
-// The characters that the document lays out alike.
+// A run of characters with the same format.
 struct PlainRun {
     QString text;
-    QTextCharFormat formats[2]; // bold and not
+    QTextCharFormat formats[2]; // bold, and not bold
 };
 
 std::vector<PlainRun> runsOf(const TText& record)

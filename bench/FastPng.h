@@ -1,5 +1,3 @@
-// The least that a lossless PNG file of a picture can cost: no line filter that pays nothing, the fastest
-// level of the fastest deflate at hand.
 #pragma once
 
 #include <QByteArray>
@@ -7,6 +5,8 @@
 
 struct libdeflate_compressor;
 
+// Writes a lossless PNG file with the least effort: a line filter only where it saves time, and the fastest
+// level of the fastest deflate library available.
 class FastPng
 {
 public:
@@ -15,8 +15,8 @@ public:
     FastPng(const FastPng&) = delete;
     FastPng& operator=(const FastPng&) = delete;
 
-    // Lines as they are, or as differences to the line above, which is smaller and faster where areas of one
-    // colour prevail.
+    // Stores lines unchanged, or as differences to the line above, which is smaller and faster for pictures
+    // with large areas of one colour.
     enum class Filter { None, Up };
 
     QByteArray encode(const QImage& image, Filter filter);

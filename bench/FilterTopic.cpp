@@ -1,4 +1,4 @@
-// What the gate before every event costs the events that it has nothing to do with.
+// The cost of the application's event filter for events that it does not handle.
 #include "bench/PairList.h"
 #include "bench/Topics.h"
 #include "touchui/KSAppEventFilter.h"
@@ -13,7 +13,7 @@ namespace
 
 constexpr double AIM = 1.05;
 
-// Counts what arrives.
+// Counts the events that arrive.
 class Target : public QWidget
 {
 public:
@@ -30,7 +30,7 @@ private:
     long mArrived = 0;
 };
 
-// Mouse moves are the most frequent events that are neither touch nor key.
+// Sends mouse moves, which are the most frequent events that are neither touches nor keys.
 void deliver(benchmark::State& state)
 {
     Target target;

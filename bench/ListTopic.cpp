@@ -1,4 +1,4 @@
-// The title list: one tick of a flick, filling it, a tap on a title and opening a folder.
+// The title list: one step of a flick, filling it, a tap on a title and opening a folder.
 #include "bench/BenchEnvironment.h"
 #include "bench/BenchTitles.h"
 #include "bench/PairList.h"
@@ -34,7 +34,7 @@ constexpr double FIRST_SCREEN_AIM = 0.15;
 constexpr double LONG_FIRST_SCREEN_AIM = 1.5;
 constexpr int TITLES = 99;
 constexpr int LONG_TITLES = 998;
-constexpr int TICK_PIXELS = 24; // of a brisk flick
+constexpr int TICK_PIXELS = 24; // of a fast flick
 constexpr int CHARACTERS = 100;
 
 QString titleFolder(const BenchEnvironment& environment)
@@ -157,7 +157,8 @@ void fillBareArea(benchmark::State& state)
     }
 }
 
-// Two titles of four texts each, the list that selects them and the canvas that shows them.
+// Makes a folder with two titles of four texts each, for a list that selects them and a canvas that shows
+// them.
 QString twoTitles(const BenchEnvironment& environment)
 {
     const QString folder = environment.makeFolder(QStringLiteral("tap"));
@@ -198,7 +199,7 @@ void tapTitle(benchmark::State& state, const BenchEnvironment& environment)
         state.SkipWithError("the title was not selected");
 }
 
-// Every text is laid out and drawn once.
+// Measures the floor: draws all texts once.
 void renderTitle(benchmark::State& state, const BenchEnvironment& environment)
 {
     TitleEditor editor(twoTitles(environment), nullptr);
@@ -213,7 +214,7 @@ void renderTitle(benchmark::State& state, const BenchEnvironment& environment)
     }
 }
 
-// Sees when the first screen of thumbnails is painted.
+// Detects when the first screen of thumbnails has been painted.
 class FirstScreen : public QObject
 {
 public:

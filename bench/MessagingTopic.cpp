@@ -1,4 +1,4 @@
-// A call to another process and its answer, against the same bytes on a bare socket.
+// A call to another process and its answer, compared with the same bytes on a plain socket.
 #include "bench/CallPeer.h"
 #include "bench/PairList.h"
 #include "bench/PeerProcess.h"
@@ -22,7 +22,7 @@ namespace
 constexpr double AIM = 1.3;
 constexpr long ANSWER_ADAPTER = 7;
 
-// Unpacks the answers and counts them.
+// Unpacks and counts the answers.
 class AnswerAdapter : public PTC::CallbackAdapter
 {
 public:

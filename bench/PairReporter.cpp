@@ -37,7 +37,7 @@ void PairReporter::ReportRuns(const std::vector<Run>& runs)
             times.wall.push_back(run.real_accumulated_time / iterations);
         }
     }
-    // Of many repetitions the middle one is enough to read.
+    // Of several repetitions only the median is printed.
     std::vector<Run> shown;
     std::copy_if(runs.begin(), runs.end(), std::back_inserter(shown), [](const Run& run) {
         return run.error_occurred || run.repetitions <= 1 || run.aggregate_name == "median";

@@ -1,10 +1,10 @@
-// The usual table of the benchmarks, and after it one line for every pair with its ratio and its aim.
 #pragma once
 
 #include "bench/PairList.h"
 
 #include <map>
 
+// Prints the usual table of the benchmarks, followed by one line for every pair with its ratio and its aim.
 class PairReporter : public benchmark::ConsoleReporter
 {
 public:
@@ -13,7 +13,7 @@ public:
     void ReportRuns(const std::vector<Run>& runs) override;
     void Finalize() override;
 
-    // Whether some benchmark reported an error, and how many pairs missed their aim.
+    // Return whether a benchmark has reported an error, and how many pairs have missed their aim.
     bool failed() const { return mFailed; }
     int missed() const { return mMissed; }
 
@@ -23,7 +23,7 @@ private:
         std::vector<double> wall;
     };
 
-    // Seconds of one iteration, the middle one of all repetitions; 0 when the benchmark did not run.
+    // Returns the seconds of one iteration, the median of all repetitions; 0 when the benchmark did not run.
     double timeOf(const std::string& name, PairList::Clock clock) const;
     void printPair(const PairList::Pair& pair);
 

@@ -1,5 +1,5 @@
-// The panel shows what a new selection of 300 characters has in common, until it is on screen, against plain
-// widgets that are given the same values.
+// Showing what the 300 characters of a new selection have in common in the panel, until it is painted,
+// compared with plain widgets that show the same values.
 #include "bench/BenchTitles.h"
 #include "bench/PairList.h"
 #include "bench/Topics.h"
@@ -16,7 +16,7 @@
 #include <array>
 #include <memory>
 
-// The macro declares functions, which a namespace would hide.
+// Outside the namespace, since the macro declares functions.
 static void loadPictures()
 {
     Q_INIT_RESOURCE(TitlerToolResource);
@@ -33,7 +33,7 @@ const QSize PANEL(1363, 209);
 
 using Selections = std::array<std::unique_ptr<TText>, 2>;
 
-// Two selections that differ in everything; within each the characters differ, too.
+// Returns two selections that differ in every property; the characters within each differ, too.
 Selections makeSelections()
 {
     Selections selections;
@@ -62,7 +62,7 @@ Selections makeSelections()
     return selections;
 }
 
-// Layout, styling and painting that the change has put off.
+// Carries out the layout, styling and painting that the change has queued.
 void show()
 {
     QCoreApplication::sendPostedEvents();
@@ -79,7 +79,7 @@ void updatePanel(benchmark::State& state)
     panel.setGeometry(QRect(QPoint(), PANEL));
     panel.selectionModeForShadowAndAlign(true, true);
     window.show();
-    // A panel lives as long as the program: its pictures are loaded once.
+    // The panel exists as long as the program, so its pictures are loaded before the measurement.
     for (const auto& selection : selections) {
         panel.updateTextStyle(selection.get());
         show();
@@ -91,8 +91,7 @@ void updatePanel(benchmark::State& state)
     }
 }
 
-// Bare widgets for the same values: two lists to choose from, switches, a number and two colours by style
-// sheet.
+// Plain widgets for the same values: two drop-down lists, switches, a number and two colours by style sheet.
 class PlainPanel : public QWidget
 {
 public:

@@ -1,4 +1,5 @@
-// Pasting a title with a photograph behind its texts, while the title that is left has no pictures yet.
+// Pasting a title with a photograph as background while the pictures of the previous title are still to be
+// made.
 #include "bench/BenchEnvironment.h"
 #include "bench/BenchTitles.h"
 #include "bench/PairList.h"
@@ -32,7 +33,7 @@ constexpr int CHARACTERS = 40;
 constexpr int CHARACTER_SIZE = 48;
 const QSize AIR(1920, 1080);
 
-// Gives the title at path all its pictures and the photograph as a background of its own.
+// Gives the title at path all its pictures, with the photograph as its background.
 void illustrate(const QString& folder, const std::string& path, const QImage& photograph)
 {
     const QString stem =
@@ -51,7 +52,7 @@ void illustrate(const QString& folder, const std::string& path, const QImage& ph
     ArchiveController().saveNewArchive(folder, &title);
 }
 
-// A folder of two titles with different photographs.
+// Makes a folder of two titles with different photographs.
 QString photographFolder(const BenchEnvironment& environment)
 {
     static const QString folder = [&environment] {
@@ -66,7 +67,7 @@ QString photographFolder(const BenchEnvironment& environment)
     return folder;
 }
 
-// Counts the titles whose pictures have been written.
+// Counts the titles whose pictures were written.
 class PictureCount : public ITitleChangeReporter
 {
 public:
@@ -84,7 +85,7 @@ private:
     std::atomic<int> mCount = 0;
 };
 
-// Lets the event loop run until all is painted that comes of the call and the pictures of a title have been
+// Calls, then runs the event loop until everything that follows is painted and the pictures of one title are
 // written. Returns the longest pass in seconds.
 template <typename Call>
 double longestPass(TitleEditor& editor, const PictureCount& pictures, Call call)
@@ -116,20 +117,21 @@ void pasteTitle(benchmark::State& state, const BenchEnvironment& environment)
     ArchiveList& list = editor.shown.list;
     ArchiveAction copy(QString(), ArchiveAction::ACTION_COPY, nullptr);
     ArchiveAction paste(QString(), ArchiveAction::ACTION_PASTE, nullptr);
-    list.selectOperationArchive(1); // the canvas shows the other one
+    list.selectOperationArchive(1); // the canvas shows the other title
     list.selectOptionMenuItem(&copy);
     for ([[maybe_unused]] auto _ : state) {
-        editor.scene.saveArchiveFlag(); // the title that is left was changed
+        editor.scene.saveArchiveFlag(); // marks the previous title as changed
         state.SetIterationTime(longestPass(editor, pictures, [&] { list.selectOptionMenuItem(&paste); }));
         if (list.count() != 3)
             state.SkipWithError("the title was not pasted");
         longestPass(editor, pictures, [&editor] { editor.undo.undo(); });
         list.synchronizationFolderFile();
-        FileSyncQueue::flush(SYNC_TIME); // an operator pastes less often than the disk writes
+        // Waits for the disk, since an operator pastes less often than it writes.
+        FileSyncQueue::flush(SYNC_TIME);
     }
 }
 
-// The files of the title copied, and its scene drawn once.
+// Measures the floor: copies the files of the title and draws its scene once.
 void copyAndDraw(benchmark::State& state, const BenchEnvironment& environment)
 {
     const QString folder = photographFolder(environment);

@@ -1,5 +1,3 @@
-// A paint device that keeps what is filled on it instead of drawing it, so that the same paths can be drawn
-// again by QPainter alone.
 #pragma once
 
 #include <QColor>
@@ -11,11 +9,13 @@
 
 class QPaintEngine;
 
+// A paint device that records the paths filled on it instead of drawing them, so that QPainter can draw the
+// same paths without the program.
 class PathRecorder : public QPaintDevice
 {
 public:
     struct FilledPath {
-        QPainterPath path; // in the space it was filled in, with an origin
+        QPainterPath path; // in the coordinates in which it was filled
         QPointF origin;    // in device pixels
         QColor color;
     };
@@ -24,7 +24,7 @@ public:
     ~PathRecorder() override;
 
     const std::vector<FilledPath>& paths() const { return mPaths; }
-    // Whether all that was painted could be kept.
+    // Returns whether everything painted could be recorded.
     bool isComplete() const { return mComplete; }
 
     QPaintEngine* paintEngine() const override;

@@ -1,4 +1,5 @@
-// The four picture files of a title, against encoding the same pictures as fast as the libraries at hand can.
+// The four picture files of a title, compared with encoding the same pictures as fast as the libraries
+// available can.
 #include "bench/BenchEnvironment.h"
 #include "bench/BenchTitles.h"
 #include "bench/FastPng.h"
@@ -23,7 +24,7 @@ constexpr double AIM = 1.2;
 constexpr unsigned long POLL = 50; // microseconds
 constexpr std::array SUFFIXES = {"_960.png", "_1920.png", "_240S.png", "_240.png"};
 
-// What the picture thread is given, and the title it is for.
+// The input of the picture thread.
 struct Job {
     Archive archive;
     QList<QImage> images; // big, middle
@@ -72,7 +73,7 @@ void runThread(PictureThread& thread, const Job& job)
         QThread::usleep(POLL);
 }
 
-// Whether the files hold the pixels that QImage::save and reading the middle file again would give.
+// Returns whether the files contain the same pixels as files made with QImage::save() and ImageResizer.
 bool filesAreRight(const Job& job)
 {
     const QString middle = job.path("_check.png");
@@ -110,7 +111,7 @@ void savePictures(benchmark::State& state, const Job& job)
         runThread(thread, job);
 }
 
-// The filter that pays depends on the picture.
+// Returns the filter that is faster for this picture.
 FastPng::Filter fasterFilter(FastPng& png, const QImage& image)
 {
     constexpr int TRIES = 3;

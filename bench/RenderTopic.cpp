@@ -1,4 +1,4 @@
-// Painting texts, against QPainter filling the same paths.
+// Painting texts, compared with QPainter filling the same paths.
 #include "bench/BenchEnvironment.h"
 #include "bench/BenchTitles.h"
 #include "bench/PairList.h"
@@ -12,7 +12,7 @@
 #include <QPainter>
 #include <QThread>
 
-// Of the widgets library; the effects blur with it.
+// Declared here, since the widgets library exports it without a header. The effects blur with it.
 void qt_blurImage(QPainter* painter, QImage& image, qreal radius, bool quality, bool alphaOnly,
                   int transposed = 0);
 
@@ -22,21 +22,21 @@ namespace
 constexpr double SLOW_PASS_AIM = 1.5;
 constexpr double REPAINT_AIM = 1.3;
 constexpr double BIG_POSITION = 1.5;       // from the 1280 canvas to the 1920 raster
-constexpr double TITLE_PIXELS_OFF = 0.002; // share of pixels in which the two drawings may differ
+constexpr double TITLE_PIXELS_OFF = 0.002; // largest share of pixels in which the two drawings may differ
 constexpr unsigned long POLL = 50;         // microseconds
-// Large enough that the program draws every character as a path.
+// The characters are large enough that the program draws each of them as a path.
 constexpr int CHARACTERS = 24;
 constexpr int SIZE = 96;
 const QSize CANVAS(1280, 720);
 
-// One text as paths, and its shadow.
+// One text as paths, with its shadow.
 struct Drawing {
     std::vector<PathRecorder::FilledPath> paths;
     bool shadow = false;
     QPointF offset;
     qreal blur = 0;
     QColor shadowColor;
-    QRect bounds; // of the text, device pixels
+    QRect bounds; // of the text, in device pixels
 };
 
 void fillPaths(QPainter& painter, const Drawing& drawing, QPointF origin)
@@ -49,7 +49,7 @@ void fillPaths(QPainter& painter, const Drawing& drawing, QPointF origin)
     painter.resetTransform();
 }
 
-// Text on a layer of its own, the layer blurred and coloured below it.
+// Draws the text on a separate layer, with the layer blurred and coloured below it.
 void fillWithShadow(QPainter& painter, const Drawing& drawing)
 {
     const int margin = qCeil(drawing.blur + qMax(qAbs(drawing.offset.x()), qAbs(drawing.offset.y())));
@@ -84,7 +84,7 @@ void draw(QPainter& painter, const std::vector<Drawing>& drawings)
     }
 }
 
-// What the text paints without its shadow.
+// Records what the text paints without its shadow.
 Drawing record(QGraphicsScene& scene, GraphicsText& text, bool& complete)
 {
     Drawing drawing;
@@ -136,7 +136,7 @@ QImage scaled(const QImage& big)
                       Qt::SmoothTransformation);
 }
 
-// Share of the pixels that are not the same.
+// Returns the share of the pixels that differ.
 double difference(const QImage& one, const QImage& other)
 {
     if (one.size() != other.size())
@@ -167,7 +167,7 @@ void slowPass(benchmark::State& state, const Archive& archive)
     ThumbnailRender render;
     for ([[maybe_unused]] auto _ : state) {
         render.makeThumbnail(&archive, true);
-        render.makePictureThreadIsFinished(); // what is drawn in a later turn of the event loop
+        render.makePictureThreadIsFinished(); // draws the pictures that are queued
         state.PauseTiming();
         waitForPictures(render);
         state.ResumeTiming();
@@ -192,7 +192,7 @@ void plainTitle(benchmark::State& state, const Archive& archive)
     }
 }
 
-// 300 outlined characters on the canvas.
+// A text of 300 outlined characters on the canvas.
 struct OutlinedText {
     QGraphicsScene scene{QRectF(QPointF(0, 0), CANVAS)};
     std::unique_ptr<TText> record = BenchTitles::text(

@@ -1,10 +1,10 @@
-// The title list with its label, shown at the size that it has in the window.
 #pragma once
 
 #include "library/ArchiveList.h"
 
 #include <QLabel>
 
+// The title list with its label, shown in the size that it has in the window.
 class ShownList
 {
 public:
@@ -12,10 +12,11 @@ public:
 
     // Opens the folder and waits until the titles in view are complete.
     void open(const QString& folder);
-    // Makes and completes the items of all titles.
+    // Makes the items of all titles with their child widgets.
     void completeAll();
 
-    // What the program does at once: layouts, queued calls, updates and the paint events of the window.
+    // Does at once what the event loop would do: layouts, queued calls, updates and the paint events of the
+    // window.
     static void show(QWidget& window);
 
 private:

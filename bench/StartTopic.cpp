@@ -1,5 +1,5 @@
-// From the start of the process to a listening port, with its siblings up, against a program that shows and
-// hides an empty window.
+// The start of the process up to a listening port, with the siblings running, compared with a program that
+// shows and hides an empty window.
 #include "bench/BenchEnvironment.h"
 #include "bench/PairList.h"
 #include "bench/PeerProcess.h"
@@ -28,8 +28,8 @@ QString program(const char* name)
     return BenchEnvironment::binaryFolder() + QLatin1Char('/') + QLatin1String(name);
 }
 
-// Asks by taking the port for a moment, which only a listener refuses: a connection would keep the listener
-// busy, and the kernel's table of sockets takes longer to read than the titler to start.
+// Checks by binding the port for a moment, which fails only when somebody listens. A connection would keep
+// the listener busy, and reading the kernel's table of sockets takes longer than the start of the titler.
 bool isListening(long client)
 {
     const int descriptor = ::socket(AF_INET, SOCK_STREAM | SOCK_CLOEXEC, 0);
@@ -56,7 +56,7 @@ bool waitListening(long client)
     return true;
 }
 
-// What the titler finds on the appliance: pictures, templates and folders.
+// Creates what the titler needs on the appliance: pictures, templates and folders.
 bool provide()
 {
     static const bool done = [] {

@@ -1,4 +1,3 @@
-// List and canvas wired as in the window, without the processes around it.
 #pragma once
 
 #include "bench/ShownList.h"
@@ -10,12 +9,13 @@
 #include <QUndoStack>
 #include <memory>
 
+// List and canvas connected as in the window, without the sibling processes.
 class TitleEditor
 {
 public:
     static const QSize CANVAS;
 
-    // Opens the folder. Without a render no pictures are made.
+    // Opens the folder. Without a picture maker no pictures are made.
     TitleEditor(const QString& folder, std::unique_ptr<IThumbnailRender> render);
 
     // Shows the list, then the canvas.

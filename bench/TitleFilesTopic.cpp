@@ -1,4 +1,4 @@
-// Reading and writing title files, against the XML library alone on the same files.
+// Reading and writing title files, compared with the XML library alone on the same files.
 #include "bench/BenchEnvironment.h"
 #include "bench/BenchTitles.h"
 #include "bench/PairList.h"
@@ -36,8 +36,8 @@ void readAndWrite(benchmark::State& state, const std::string& path)
             state.SkipWithError("the title does not come back");
             break;
         }
-        // A title is saved once and then left alone: the background thread that brings it to the disk is not
-        // raced by the next save.
+        // Waits outside the measurement until the background thread has synced the file, since operators do
+        // not save a title again at once.
         state.PauseTiming();
         FileSyncQueue::flush(SYNC_TIME);
         state.ResumeTiming();

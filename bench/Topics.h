@@ -1,9 +1,9 @@
-// The pairs of each topic.
 #pragma once
 
 class PairList;
 class BenchEnvironment;
 
+// Each function registers the pairs of one topic.
 namespace Topics
 {
 

@@ -1,4 +1,4 @@
-// One key typed into a long text until it is on screen, against a plain text item with the same formats.
+// Typing one key into a long text until it is painted, compared with a plain text item with the same formats.
 #include "bench/BenchTitles.h"
 #include "bench/PairList.h"
 #include "bench/Topics.h"
@@ -30,7 +30,7 @@ void key(QGraphicsView& view, Qt::Key code, const QString& text)
     QApplication::sendEvent(&view, &release);
 }
 
-// What the program does at once: updates that the scene has put off, and the paint event of the view.
+// Does at once what the event loop would do: the queued updates of the scene and the paint event of the view.
 void show(QGraphicsView& view)
 {
     QCoreApplication::processEvents();
@@ -50,7 +50,7 @@ void prepare(QGraphicsView& view)
     show(view);
 }
 
-// Types and takes back; only the typing is measured. False when a key did not arrive.
+// Types keys and removes them; only the typing is measured. Returns false when a key did not arrive.
 void typeKeys(benchmark::State& state, QGraphicsView& view, const QTextDocument& document)
 {
     const int before = document.characterCount();

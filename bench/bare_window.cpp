@@ -1,5 +1,5 @@
-// The least that a program with a full-screen window costs: shows an empty window, hides it and ends.
-// With --stay the window stays until the process is ended.
+// The least that a program with a full-screen window costs: shows an empty window, hides it and ends. With
+// --stay the window stays until the process is ended.
 #include <QApplication>
 #include <QEvent>
 #include <QWidget>

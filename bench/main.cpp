@@ -4,7 +4,7 @@
 //   titler_bench --strict        the same; the exit code is 1 when a pair misses its aim
 //   titler_bench --memory [N]    resident memory over N sessions (500) instead
 //   titler_bench --memory-list   resident memory with a long folder in the list instead
-//   titler_bench --benchmark_... as any Google Benchmark program
+//   titler_bench --benchmark_... any option of Google Benchmark
 #include "bench/BenchEnvironment.h"
 #include "bench/BenchTitles.h"
 #include "bench/CallPeer.h"
@@ -32,7 +32,7 @@ int runRole(const char* role, int argc, char* argv[])
     return peer.run();
 }
 
-// The programs are driven by mouse and keys on a display, for which there is a script.
+// Runs the script that drives the programs by mouse and keys on a display.
 int runMemory(const char* argument)
 {
     const QByteArray build = QFileInfo(BenchEnvironment::binaryFolder()).path().toLocal8Bit();
@@ -43,7 +43,7 @@ int runMemory(const char* argument)
 
 int writeTitles(const char* folder, const char* count)
 {
-    constexpr int TEXTS = 3; // leaves room for one more
+    constexpr int TEXTS = 3; // leaves room for one more text
     const int wanted = std::atoi(count);
     return BenchTitles::writeIllustratedFolder(folder, wanted, TEXTS).size() ==
                    static_cast<std::size_t>(wanted)
@@ -59,8 +59,8 @@ bool takeOption(std::vector<char*>& arguments, const char* option)
 int runPairs(std::vector<char*> arguments, const BenchEnvironment& environment)
 {
     const bool strict = takeOption(arguments, "--strict");
-    // Both sides of a pair take turns, so that a busy moment of the machine does not fall on one alone. What
-    // is given on the command line comes later and prevails.
+    // The sides of a pair alternate, so that a busy moment of the machine does not affect only one of them.
+    // Options on the command line come later and take precedence.
     char repetitions[] = "--benchmark_repetitions=5";
     char interleaving[] = "--benchmark_enable_random_interleaving=true";
     char minimumTime[] = "--benchmark_min_time=0.2";

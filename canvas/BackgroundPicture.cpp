@@ -9,14 +9,15 @@
 namespace
 {
 
-// Those in use, which are one or two.
+// The pictures in use: one or two.
 std::vector<std::weak_ptr<const BackgroundPicture>>& pictures()
 {
     static std::vector<std::weak_ptr<const BackgroundPicture>> list;
     return list;
 }
 
-// Opening a pipe waits until somebody writes to it, and a device may never end.
+// Fails for all but regular files: opening a pipe blocks until somebody writes to it, and reading a device
+// may never end.
 bool statusOf(const QString& path, struct stat& status)
 {
     return ::stat(QFile::encodeName(path).constData(), &status) == 0 && S_ISREG(status.st_mode);
@@ -28,7 +29,7 @@ bool isSameFile(const struct stat& a, const struct stat& b)
            a.st_mtim.tv_sec == b.st_mtim.tv_sec && a.st_mtim.tv_nsec == b.st_mtim.tv_nsec;
 }
 
-// Comparing is fifty times faster than decoding.
+// Compares the bytes of two files, which is fifty times faster than decoding one.
 bool haveSameBytes(const QString& one, const QString& other)
 {
     QFile a(one);
@@ -102,8 +103,8 @@ bool BackgroundPicture::isThatOf(const QString& path, const struct stat& status)
            haveSameBytes(m_path, path);
 }
 
-// Read past the application's cache of pictures: a background is of no more use once its title is off the
-// canvas, and four megabytes large.
+// Bypasses the application's picture cache: a background takes four megabytes and is not needed again once
+// its title has left the canvas.
 QImage BackgroundPicture::read(const QString& path)
 {
     QImage image = PictureReader::read(path);

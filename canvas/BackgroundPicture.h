@@ -6,14 +6,15 @@
 #include <memory>
 #include <sys/stat.h>
 
-// The picture in a background file. Objects that show the same file at the same time, or one with the same
-// bytes, as a pasted title does, share the decoded pixels; nothing is kept for later.
+// The picture in a background file. Objects that show the same file at the same time, or a file with the same
+// bytes (as a pasted title does), share the decoded pixels. Nothing is cached once no object shows it.
 class BackgroundPicture
 {
 public:
-    // Never null; a file that cannot be read gives an empty pixmap. GUI thread only.
+    // Loads the picture. Never returns null; a file that cannot be read gives an empty pixmap. GUI thread
+    // only.
     static std::shared_ptr<const BackgroundPicture> load(const QString& path);
-    // The same in two steps, of which any thread may do the first one, which takes long.
+    // Loads a picture in two steps. The first one, read(), takes long and may run in any thread.
     struct Decoded {
         QString path;
         struct stat status = {};
@@ -21,17 +22,18 @@ public:
     };
     static Decoded decode(const QString& path);
     static std::shared_ptr<const BackgroundPicture> load(const Decoded& decoded);
-    // Null if no picture of the file, or of one with the same bytes, is in use. GUI thread only.
+    // Returns the picture of the file, or of one with the same bytes, if an object shows it; null otherwise.
+    // GUI thread only.
     static std::shared_ptr<const BackgroundPicture> find(const QString& path);
-    // Decodes into the format that needs no conversion for a pixmap; null when that cannot be done. Any
-    // thread.
+    // Decodes into the format that needs no conversion for a pixmap. Returns a null image when the file
+    // cannot be decoded. Any thread.
     static QImage read(const QString& path);
 
     const QPixmap& pixmap() const { return m_pixmap; }
 
 private:
     explicit BackgroundPicture(const Decoded& decoded);
-    // Whether the picture is what the file with this status holds.
+    // Returns whether the file at path, which has this status, contains this picture.
     bool isThatOf(const QString& path, const struct stat& status) const;
 
     QString m_path;

@@ -59,7 +59,7 @@ CanvasScene::CanvasScene(std::unique_ptr<IThumbnailRender> render, QObject* pare
     , m_texts(std::make_unique<TextObjectList>(*this))
     , m_safeArea(std::make_unique<SafeAreaLines>(*this))
 {
-    // A handful of items that change their size with every key: an index costs more than it saves.
+    // An index costs more than it saves: there are only a few items, and their size changes with every key.
     setItemIndexMethod(NoIndex);
     if (render)
         connect(render.get(), &IThumbnailRender::saveHalfThumbnailsOK, this, &CanvasScene::signalSaveOk);
@@ -71,7 +71,7 @@ CanvasScene::CanvasScene(std::unique_ptr<IThumbnailRender> render, QObject* pare
 
 CanvasScene::~CanvasScene()
 {
-    // Items report to this class while they are destroyed.
+    // Items emit signals to the scene while they are destroyed.
     blockSignals(true);
     for (GraphicsText* item : std::as_const(*m_texts).listed())
         item->disconnect(this);
@@ -101,7 +101,7 @@ void CanvasScene::savePreviousArchiveInfo()
     removeAllItems();
 }
 
-// The pointers are cleared before what they point to is destroyed.
+// Clears the pointers before the items are destroyed.
 void CanvasScene::removeAllItems()
 {
     m_texts->listed().clear();
@@ -114,7 +114,7 @@ void CanvasScene::removeAllItems()
 void CanvasScene::leaveTitle()
 {
     leaveEditing();
-    m_currentPressedObjectId = -1; // nor is one spared that a finger was on
+    m_currentPressedObjectId = -1; // an object under a finger is deleted, too, if it is blank
     slotDeleteEmptyItems();
     slotMakeSceneThumnail();
 }
@@ -138,7 +138,7 @@ bool CanvasScene::archiveIsNull(const Archive* archive)
 {
     if (archive)
         return false;
-    // A later save must not empty the title that was shown before.
+    // Without this a later save would empty the title that was shown before.
     m_title->forget();
     if (m_drawSafeArea)
         drawSafeAreaRect();
@@ -149,9 +149,10 @@ bool CanvasScene::archiveIsNull(const Archive* archive)
 void CanvasScene::slotUpdateArchive(const Archive* archive)
 {
     endPreview();
-    const auto previous = m_currentPixmapItem ? m_currentPixmapItem->source() : nullptr; // a paste shares it
+    // Kept so that a pasted title can share it.
+    const auto previous = m_currentPixmapItem ? m_currentPixmapItem->source() : nullptr;
     savePreviousArchiveInfo();
-    // A text that was being typed until now is in no picture yet.
+    // The pictures do not show yet what was typed last.
     const Archive* before = m_title->archive();
     if (before && (!archive || archive->getPath() != before->getPath()))
         slotMakeSceneThumnail();
@@ -188,7 +189,7 @@ void CanvasScene::addText(GraphicsText* item)
 GraphicsText* CanvasScene::rebuildItem(TText* record, TText& lastAlpha)
 {
     if (GraphicsText* old = findTextItem(record->getTextObjectID()))
-        deleteItem(old); // came back with a file that could not be written without it
+        deleteItem(old); // restored together with a file that could not be written without it
     addText(m_pairs->make(*record, lastAlpha, NewTextStyle::FirstCharacter().ensureMode));
     m_currentItem->changeItemToSolidLineState();
     return m_currentItem;
@@ -228,7 +229,7 @@ void CanvasScene::pushCommand(QUndoCommand* command)
         Q_EMIT signalPushUndoCommandIntoStack(command);
         return;
     }
-    // Without a stack the change is done all the same, once and for all.
+    // Without an undo stack the change is made and cannot be undone.
     const std::unique_ptr<QUndoCommand> owned(command);
     owned->redo();
 }
@@ -243,7 +244,7 @@ void CanvasScene::addCGraphicsTextItem()
     } else if (itemIsSelectionMode()) {
         clearItemsSelectionMode();
     }
-    slotDeleteEmptyItems(); // also a hidden one: it would count among the four
+    slotDeleteEmptyItems(); // deletes hidden empty objects, too, which would count towards the limit of four
     if (m_texts->listed().size() >= MAX_TEXT_OBJECTS) {
         Q_EMIT signalTextInserted();
         Q_EMIT signalNewTextInsertedFailed();
@@ -272,7 +273,7 @@ int CanvasScene::initCGraphicsTextItem()
     const int id = m_texts->freeId(MAX_TEXT_OBJECTS);
     if (id < 0)
         return id;
-    setSafeAreaRectLineZValue(-1); // it would hide what lies under it
+    setSafeAreaRectLineZValue(-1); // the line would hide the items below it
     const QPointF place = m_pairs->getInitItemScenePosition();
     m_topZ = int(m_texts->maxZValue()) + 1;
     addText(m_pairs->makeNew(id, place, m_topZ, *m_newTextStyle));
@@ -432,7 +433,7 @@ void CanvasScene::mouseDoubleClickEvent(QGraphicsSceneMouseEvent* event)
 void CanvasScene::mouseReleaseEvent(QGraphicsSceneMouseEvent* event)
 {
     if (event->button() != Qt::LeftButton) {
-        QGraphicsScene::mouseReleaseEvent(event); // it may have grabbed an object by a double click
+        QGraphicsScene::mouseReleaseEvent(event); // an item may have grabbed the mouse on a double click
         return;
     }
     const bool pressed = m_currentPressedObjectId != -1;
@@ -493,7 +494,7 @@ void CanvasScene::inputMethodEvent(QInputMethodEvent* event)
 
 void CanvasScene::focusOutEvent(QFocusEvent* event)
 {
-    // The object that is edited keeps the focus while the panel or the keyboard is used.
+    // The object being edited keeps the focus while the panel or the keyboard is used.
     if (!itemIsEditorInteraction())
         QGraphicsScene::focusOutEvent(event);
 }

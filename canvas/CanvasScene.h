@@ -26,15 +26,15 @@ namespace SubCommonDefine
 struct tagSoftKeyBoardInitData;
 }
 
-// The edit canvas: shows one title, owns its text objects, sends style changes to the right object, makes the
-// undo commands of object changes, saves the title and drives the soft keyboard. Scene coordinates are the
-// 1280 by 720 canvas. GUI thread only.
+// The edit canvas: shows one title, owns its text objects, passes style changes to the right object, creates
+// the undo commands for changes of objects, saves the title and opens and closes the soft keyboard. Scene
+// coordinates are the 1280 by 720 canvas. GUI thread only.
 class CanvasScene : public QGraphicsScene
 {
     Q_OBJECT
 public:
     static constexpr int SIDEBYSIDE = 2;
-    // Cascade step of a new object.
+    // Distance by which a new object is shifted when its place is taken.
     static constexpr int OFFSET = 20;
     static constexpr int ZVALUE = 1000;
     static constexpr int MAX_TEXT_OBJECTS = 4;
@@ -50,22 +50,22 @@ public:
     static QEvent mRegisterEvent;
     static const QString FAMILY_FOR_CN_MODULE;
 
-    // Takes the picture maker over; null: no pictures are made and isEditFinish() is always true.
+    // Takes ownership of the picture maker. With null no pictures are made and isEditFinish() is always true.
     explicit CanvasScene(std::unique_ptr<IThumbnailRender> render, QObject* parent = nullptr);
     ~CanvasScene() override;
 
     void saveArchive();
-    // Marks that the pictures of the title are out of date.
+    // Marks the pictures of the title as out of date.
     void saveArchiveFlag();
     void createThumnailPicture();
     bool isEditFinish() const;
-    // Blocks until the pictures are written, or nothing has come of them for a long time: the disk hangs, and
-    // they are written when it goes on. Returns isEditFinish().
+    // Blocks until the pictures are written, or until none has been written for a long time because the disk
+    // hangs; they are written when it works again. Returns isEditFinish().
     bool waitForPictures() const;
-    // Call before the operator leaves the title shown: what is being edited is taken over, blank objects are
-    // deleted, and the pictures are made.
+    // Call before another title is shown: commits what is being edited, deletes blank objects and makes the
+    // pictures.
     void leaveTitle();
-    // Shows no title. Nothing is saved.
+    // Empties the canvas without saving.
     void clearCanvas();
 
     bool itemIsEditorInteraction() const;
@@ -74,20 +74,21 @@ public:
     void clearItemsSelectionAndFocus();
     void disableTextPropertyArea() { Q_EMIT signalSceneNotifyIfExistSelectedObject(false); }
 
-    // Deleted objects stay in the scene hidden; every loop over items uses this list.
+    // Returns the items that are not deleted. Deleted objects stay in the scene, hidden, so every loop over
+    // items has to use this list.
     QList<QGraphicsItem*> enableItems() const;
-    // The children of the objects shown.
+    // Returns the children of the objects shown.
     QList<GraphicsText*> getTextItemList() const;
     void setTextItemList(const QList<GraphicsText*>& items);
-    // The enabled child with the id, or null.
+    // Returns the enabled child with the id, or null.
     GraphicsText* findTextItem(int id) const;
-    // Hides and disables the pair; undo builds a new one.
+    // Hides and disables the pair; undo creates a new one.
     void deleteItem(GraphicsText* item);
     void deleteSelectedItems();
     void connectSignalAndSlot(GraphicsText* item);
-    // Makes an object with the panel's style; the new id, or -1 when four exist.
+    // Creates an object with the style of the panel. Returns its id, or -1 when there are four already.
     int initCGraphicsTextItem();
-    // Makes, wires and lists a pair that shows the record, for undo.
+    // Creates a pair that shows the record, connects it and adds it to the list. For undo.
     GraphicsText* rebuildItem(TText* record, TText& lastAlpha);
     void setCurrentEditItemId(int id) { m_currentEditItemId = id; }
     int currentEditItemId() const { return m_currentEditItemId; }
@@ -106,10 +107,10 @@ public:
     void removeSafeAreaRect();
     void setSafeAreaRectLineZValue(int z);
     void generateThumbnail(QSize size, const QString& path);
-    // The copy of the title shown, or null; owned by the scene.
+    // Returns the copy of the title shown, which the scene owns, or null.
     const Archive* archive() const;
-    // Call when a folder was renamed: what is still to be saved in it is saved there. If it is that of the
-    // title shown, what is being typed is taken over.
+    // Call when a folder was renamed: pending writes for it go to its new path. If the title shown is in that
+    // folder, text being typed is committed.
     void folderRenamed(const QString& before, const QString& after);
 
 public Q_SLOTS:
@@ -133,8 +134,8 @@ public Q_SLOTS:
     void slotSaveArchive(GraphicsText* item);
     void slotSetItemInputlanguage(GraphicsText* item);
     void slotNotifyEditAreaSizeToolBoxEditDone() {}
-    // Call before the selection, its text or the title changes. Whoever previews a style ends that now, and
-    // what is still previewed after that is taken back.
+    // Call before the selection, its text or the title changes. Asks widgets that preview a style to end the
+    // preview, then takes back any preview that is left.
     void endPreview();
 
 Q_SIGNALS:
@@ -143,20 +144,20 @@ Q_SIGNALS:
     void signalItemSelected(QGraphicsItem* item);
     void signalPixmapItemInserted(QGraphicsPixmapItem* item);
     void signalSaveOk(QString path, QImage image);
-    // Valid during the call only.
+    // Reports the style of the selection, which is valid during the call only.
     void signalNotifyPropertyAreaUpdateCurrentTextStyle(TText* style);
-    // The receiver owns the command.
+    // Passes an undo command to the receiver, which owns it.
     void signalPushUndoCommandIntoStack(QUndoCommand* command);
     void signalSceneNotifyIfExistSelectedObject(bool exists);
     void signalSceneNotifyTextPropertyAreaObjectSelectionMode(bool shadowAndAlign, bool move);
     void signalBeginNewTextItem();
     void signalStartEditTextItem();
-    // A missing family found while the window was hidden, to be reported when it shows.
+    // Reports a missing family that was found while the window was hidden, so that it can be shown later.
     void signalHasMessageToShowInformation(bool has, QString family);
     void signalDisableNewTextButton(bool disable);
     void signalCanvasSceneMousePressed();
     void signalSceneSoftWareClosedWhenEditObject();
-    // The selection, its text or the title is about to change; what was selected still is.
+    // Emitted before the selection, its text or the title changes, while the old selection is still in place.
     void signalEndPreview();
 
 protected:
@@ -171,7 +172,7 @@ protected:
 private:
     void savePreviousArchiveInfo();
     void removeAllItems();
-    // Ends editing and selection, and puts the keyboard away that was open for them.
+    // Ends editing and selection, and closes the soft keyboard that was open for them.
     void leaveEditing();
     bool archiveIsNull(const Archive* archive);
     void reportMissingFamily();

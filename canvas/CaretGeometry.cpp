@@ -7,7 +7,8 @@
 
 namespace
 {
-// The caret stands one pixel right of its character, and the last line three pixels above the lower margin.
+// The caret is drawn one pixel right of its character; the last line ends three pixels above the lower
+// margin.
 constexpr double CaretShift = 1.0;
 constexpr double LastLineLift = 3.0;
 
@@ -26,7 +27,7 @@ void CaretGeometry::refresh()
 {
     if (m_valid)
         return;
-    // Asking for the size finishes a layout under way.
+    // Reading the size completes a pending layout.
     m_documentHeight = m_document.size().height();
     m_heightsAbove.clear();
     double above = 0.0;

@@ -6,19 +6,19 @@
 class QPainter;
 class QPixmap;
 
-// Paints caret and selection handles of a text object that is edited. GUI thread only.
+// Paints the caret and the selection handles of a text object that is being edited. GUI thread only.
 class CaretPainter
 {
 public:
-    // The state outlives this object.
+    // Keeps a reference to the state, which must outlive this object.
     CaretPainter(const TextObjectParts& parts, TouchState& state);
 
-    // Below the glyphs: the selection while a handle is dragged.
+    // Paints the selection below the glyphs while a handle is dragged.
     void paintSelectionWhenContinueSelect(QPainter* painter) const;
-    // Above the glyphs: caret, or the handles.
+    // Paints the caret or the handles above the glyphs.
     void paintCaretAndHandles(QPainter* painter);
 
-    // Brings both ends to where the cursor stands now.
+    // Moves both handles to the ends of the cursor's selection.
     void refreshHandles();
     // Returns whether no handle is shown, so that the selection cannot be dragged.
     bool noHandleCursor() const;

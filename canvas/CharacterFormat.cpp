@@ -45,7 +45,7 @@ FontStore& store()
     static bool connected = false;
     if (!connected && qGuiApp) {
         connected = true;
-        // A font that was imported may bring a missing family.
+        // An imported font may make a missing family available.
         QObject::connect(qGuiApp, &QGuiApplication::fontDatabaseChanged, qGuiApp, [] {
             fontStore.installed.clear();
             fontStore.fonts.clear();
@@ -73,7 +73,7 @@ bool CharacterFormat::familyIsInstalled(const QString& family)
     auto& installed = store().installed;
     auto found = installed.constFind(family);
     if (found == installed.constEnd()) {
-        // Names come from files: forget rather than grow without end.
+        // Family names come from files, so the cache is bounded.
         if (installed.size() > CachedFonts)
             installed.clear();
         const QFont font(family);

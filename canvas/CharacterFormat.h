@@ -8,25 +8,28 @@
 
 class TextStyle;
 
-// Turns character styles into fonts and layout formats. Fonts are shared by all text objects and kept by
-// family, size, weight, slant and spacing, so that a character costs no look-up in the font system. GUI
+// Turns character styles into fonts and layout formats. All text objects share the fonts, which are cached by
+// family, size, weight, slant and spacing, so that most characters need no query of the font database. GUI
 // thread only.
 class CharacterFormat
 {
 public:
-    // False when the font system would answer with another family; an empty family is never installed.
+    // Returns false when the font database would substitute another family; an empty family is never
+    // installed.
     static bool familyIsInstalled(const QString& family);
 
-    // ratio: raster pixels per stored pixel. Sizes are kept within 1 to 999 stored pixels.
+    // Returns the font of a style. ratio: raster pixels per stored pixel. Sizes are limited to 1 to 999
+    // stored pixels.
     static QFont font(const TextStyle& style, double ratio);
     static int pixelSize(const TextStyle& style, double ratio);
 
-    // Format of a character for layout. Its foreground has alpha 0: the document only places characters.
+    // Returns the format of a character for layout. Its foreground is transparent, since the document is only
+    // used for layout.
     static QTextCharFormat layoutFormat(const TextStyle& style, double ratio);
 
-    // A colour of a record; black if the text is not a colour.
+    // Returns a colour of a record; black if the text is not a colour.
     static QColor color(const std::string& text);
 
-    // Width of the outline pen in raster pixels; a pen of width 0 draws a hairline.
+    // Returns the width of the outline pen in raster pixels; a pen of width 0 draws a hairline.
     static int outlineWidth(const TextStyle& style, double ratio);
 };

@@ -5,15 +5,14 @@
 
 #include <memory>
 
-// Makes a new text object; Undo hides the object, redo builds it
-// anew.
+// Creates a text object. Undo hides the object, redo creates it anew.
 class CreateItemCommand : public CanvasCommand
 {
 public:
-    // Makes the object at once, so that it exists before the command is pushed.
+    // Creates the object at once, so that it exists before the command is pushed.
     explicit CreateItemCommand(CanvasScene* scene, QUndoCommand* parent = nullptr);
 
-    // -1 when no object could be made.
+    // Returns the id of the object, or -1 when it could not be created.
     int objectId() const { return m_objectId; }
 
 private:

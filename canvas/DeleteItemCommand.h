@@ -3,8 +3,7 @@
 #include "canvas/CanvasCommand.h"
 #include "document/TText.h"
 
-// Hides a text object; Undo builds the object anew from the copy
-// that was taken when the command was made.
+// Hides a text object. Undo creates the object anew from the copy that was taken when the command was made.
 class DeleteItemCommand : public CanvasCommand
 {
 public:

@@ -15,11 +15,11 @@ class DrawBoundingRectangle : public QObject
 public:
     explicit DrawBoundingRectangle(QObject* parent = nullptr);
 
-    // The background of one kind of widget, 1 to 9; any other kind gives a null pixmap. Pieces whose picture
-    // is missing stay transparent.
+    // Returns the background of one kind of widget, 1 to 9; a null pixmap for any other kind. Pieces whose
+    // picture is missing stay transparent.
     QPixmap paintBoundingRectangle(int kind);
 
-    // Order of the nine names of a list.
+    // The order of the nine picture names in a list.
     enum Piece {
         BottomRight,
         BottomCenter,
@@ -33,10 +33,9 @@ public:
         PieceCount
     };
 
-    // Builds a pixmap of the size from nine pictures: corners at their natural size, the rest stretched
-    // between.
+    // Builds a pixmap of the size from nine pictures: corners in their natural size, the rest stretched.
     QPixmap drawImage(const QStringList& names, const QSize& size);
-    // The same with the middle drawn first, so that the edges of a dialog lie over its filling.
+    // Draws the same pixmap with the middle first, so that the edges of a dialog cover its filling.
     QPixmap drawImageLikeAsKSDialog(const QStringList& names, const QSize& size);
 
 private:

@@ -3,7 +3,7 @@
 #include "canvas/CanvasCommand.h"
 #include "document/TText.h"
 
-// A change of text or style of one object;
+// A change of text or style of one object.
 class EditTextCommand : public CanvasCommand
 {
 public:
@@ -11,7 +11,8 @@ public:
     EditTextCommand(TText* oldText, TText* newText, TText* oldLast, TText* newLast, CanvasScene* scene,
                     QUndoCommand* parent = nullptr);
 
-    // Clear while the change of the newest command is already on screen; shared by all commands.
+    // Cleared while the change of the newest command is already on screen, so that pushing it draws nothing.
+    // Shared by all commands.
     static bool mRedoButtonClickedFlag;
 
 private:

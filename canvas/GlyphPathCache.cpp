@@ -12,7 +12,7 @@
 namespace
 {
 
-// Enough for the distinct characters of two titles at both sizes.
+// Large enough for the distinct characters of two titles in both sizes.
 constexpr int CacheBytes = 2 * 1024 * 1024;
 constexpr int RememberedPenWidths = 2;
 
@@ -39,7 +39,8 @@ bool mayBePicture(const QString& text)
     });
 }
 
-// What was found out about fonts and their characters. A font that was imported may bring a missing family.
+// What is known about fonts and their characters. Cleared when fonts are imported, since these may make a
+// missing family available.
 struct GlyphStore {
     using Entry = std::shared_ptr<const GlyphPath>;
 
@@ -68,7 +69,7 @@ GlyphStore& store()
     return glyphStore;
 }
 
-// Fonts of coloured pictures have no outlines worth drawing.
+// Returns whether the font consists of coloured pictures, whose outlines are not usable.
 bool isPictureFont(const QRawFont& font)
 {
     auto& known = store().pictureFonts;
@@ -116,7 +117,7 @@ const QPainterPath& GlyphPath::fill() const
 {
     if (!m_fillMade) {
         m_fill.addText(0.0, 0.0, m_font, m_text);
-        // Contours of one glyph may overlap.
+        // The contours of one glyph may overlap.
         m_fill.setFillRule(Qt::WindingFill);
         m_fillMade = true;
     }
@@ -161,8 +162,8 @@ const QPainterPath& GlyphPath::outline(int penWidth) const
 
 int GlyphPath::cost() const
 {
-    // Counted in advance: contours have some forty points, Chinese ones a hundred, and outlines four times as
-    // many.
+    // Estimated, since the forms are computed later: a contour has about forty points, a Chinese one a
+    // hundred, and its outlines have four times as many.
     const int points = m_text.isEmpty() || m_text.at(0).unicode() < 0x2E80 ? 40 : 100;
     return int(sizeof(GlyphPath)) + 6 * points * int(sizeof(QPainterPath::Element));
 }

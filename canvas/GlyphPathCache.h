@@ -8,24 +8,26 @@
 #include <memory>
 #include <vector>
 
-// Shape of one character (with its marks) at the origin of its baseline. Each form of it is made when it is
-// first asked for, once per font and text.
+// The shape of one character (with its marks), with the origin on its baseline. Each form of it is computed
+// when it is first requested, once per font and text.
 class GlyphPath
 {
 public:
     GlyphPath(const QFont& font, const QString& text);
 
-    // False for characters without an outline, which only the font system can draw: colour emoji.
+    // Returns false for characters without an outline, such as colour emoji, which only the font system can
+    // draw.
     bool hasPath() const { return m_hasPath; }
     const QPainterPath& fill() const;
-    // The area that a pen of the width covers on the merged contour. Width at least 1.
+    // Returns the area that a pen of the width covers when it follows the merged contour. The width is at
+    // least 1.
     const QPainterPath& outline(int penWidth) const;
-    // The merged contour itself, for hairlines.
+    // Returns the merged contour itself, for hairlines.
     const QPainterPath& contour() const;
-    // The glyphs as the font system draws them; positions are relative to the baseline.
+    // Returns the glyphs as the font system draws them; positions are relative to the baseline.
     const QList<QGlyphRun>& runs() const;
 
-    // Bytes, roughly, of all forms.
+    // Returns an estimate of the bytes that all forms take.
     int cost() const;
 
 private:
@@ -46,7 +48,7 @@ private:
     bool m_hasPath = true;
 };
 
-// The glyph paths used last in this process; those on screen are held by their text objects. GUI thread only.
+// Caches the glyph paths used last in this process. Text objects keep those on screen alive. GUI thread only.
 class GlyphPathCache
 {
 public:

@@ -18,7 +18,7 @@ public:
     // Shows the given picture of the file at path.
     GraphicsPixmap(const QString& path, const QPixmap& picture, QGraphicsItem* parent = nullptr);
 
-    // What was loaded, also when another pixmap is shown by now; null without a load.
+    // Returns the picture that was loaded, even if another pixmap is shown now; null if none was loaded.
     std::shared_ptr<const BackgroundPicture> source() const { return m_source; }
     QString getPixmapPath() const { return m_path; }
 

@@ -32,7 +32,8 @@ using namespace TextObjectConstants;
 namespace
 {
 
-// The document's own caret is not painted, so its blinking would repaint the object for nothing.
+// Returns whether the event is a blink of the document's own caret, which is not painted: it would only cause
+// repaints.
 bool isBlinkOfCaret(QObject* watched, const QEvent* event)
 {
     if (event->type() != QEvent::Timer)
@@ -80,15 +81,15 @@ void GraphicsText::initDataForGraphicsText()
     setFlag(ItemIsMovable);
     setFlag(ItemIsSelectable);
     setAcceptTouchEvents(true);
-    // The frame reaches out of the child; a finger there would drag the pair behind the child's back.
+    // The frame is larger than the child. A finger on it must not drag the parent without the child.
     if (m_parentObject)
         setAcceptedMouseButtons(Qt::NoButton);
     setAcceptDrops(false);
-    // Undo steps are formed from the records; the document's own would contradict them.
+    // Undo steps are formed from the records; the document's own undo would conflict with them.
     document()->setUndoRedoEnabled(false);
     document()->setDocumentMargin(DOCUMENT_MARGIN);
     QTextOption option = document()->defaultTextOption();
-    // An object is as wide as its longest line; rounding must not break that line.
+    // An object is as wide as its longest line, which must not be wrapped because of rounding.
     option.setWrapMode(QTextOption::NoWrap);
     document()->setDefaultTextOption(option);
 
@@ -359,7 +360,7 @@ bool GraphicsText::isBlank() const
     return toPlainText().simplified().trimmed().isEmpty();
 }
 
-// What the units ask for
+// ITextSurface: what the units need from the item
 
 void GraphicsText::setWritable(bool writable)
 {
@@ -404,7 +405,7 @@ void GraphicsText::showShadow(const TShadow& shadow)
     m_shadowEffect->setEnabled(shadow.getShadowDirectionX() != 0 || shadow.getShadowDirectionY() != 0);
 }
 
-// What the units report
+// ITextObjectListener: what the units report
 
 void GraphicsText::contentsEdited(TText& before, TText& after, TText& lastBefore, TText& lastAfter)
 {
@@ -459,7 +460,7 @@ void GraphicsText::keyboardWanted(bool wanted)
 void GraphicsText::keyboardClosed()
 {
     LOG_DEBUG_OPERATE(L"Edit Area", 200, L"*****SoftKeyBoardClosed event is received*****");
-    // No later step may come between what was typed and the end of it.
+    // Pushes the undo step of the typed text first, so that no later step is pushed before it.
     m_styleEditor->pushLastEditTextIntoStack();
     if (!(m_styles->undoBaseline() == m_styles->current())) {
         TText before = m_styles->undoBaseline();
@@ -531,15 +532,15 @@ QRectF GraphicsText::boundingRect() const
     const GraphicsText* child = m_parentObject ? childTextItem() : nullptr;
     if (!child)
         return layoutRect();
-    // The frame runs around the child.
+    // The frame is drawn around the child.
     constexpr double pen = ITEMBOUNDINGWIDTH / 2.0;
     return layoutRect().united(child->layoutRect()).adjusted(-pen, -pen, pen, pen);
 }
 
 void GraphicsText::paint(QPainter* painter, const QStyleOptionGraphicsItem*, QWidget*)
 {
-    // Neither Qt's selection frame nor the document's own caret is wanted, and its glyphs are invisible: the
-    // base class has nothing to paint.
+    // The base class has nothing to paint: Qt's selection frame and the document's own caret are not wanted,
+    // and its glyphs are transparent.
     painter->save();
     if (m_parentObject) {
         paintFrame(painter);
@@ -616,7 +617,7 @@ void GraphicsText::keyPressEvent(QKeyEvent* event)
         handleByTextItem(QEvent::KeyPress, *event);
         return;
     }
-    // Pasted text takes the style of the place it comes to, not the one it had elsewhere.
+    // Pasted text takes the style of the place where it is inserted, not the one it was copied with.
     if (event->matches(QKeySequence::Paste) && textInteractionFlags() == Qt::TextEditorInteraction) {
         textCursor().insertText(QGuiApplication::clipboard()->text());
         event->accept();

@@ -39,37 +39,39 @@ class GraphicsText : public QGraphicsTextItem, private ITextSurface, private ITe
 public:
     enum { Type = CanvasTextField::ITEM_TYPE };
 
-    // A child that shows a copy of the record (null: a default record without characters). An id that is not
-    // 0 becomes the id of the copy.
+    // Makes a child that shows a copy of the record (null: a default record without characters). An id that
+    // is not 0 becomes the id of the copy.
     GraphicsText(TText* record, int id, QGraphicsItem* parent = nullptr, QGraphicsScene* scene = nullptr);
-    // A parent, or with parentObject false an empty child. Added to the scene when one is given.
+    // Makes a parent, or with parentObject false an empty child, and adds it to the scene when one is given.
     GraphicsText(bool parentObject, QGraphicsItem* parent, QGraphicsScene* scene);
     ~GraphicsText() override;
 
     bool isParentObject() const { return m_parentObject; }
-    // A parent object that has its child.
+    // Returns whether this is a parent that has its child.
     bool isParentItem() const;
-    // The other half of the pair, or null.
+    // Returns the other half of the pair, or null.
     GraphicsText* parentTextItem() const;
     GraphicsText* childTextItem() const;
-    // Places the pair and its record; the next change of style starts from there. Scene coordinates.
+    // Places the pair and updates its record and the state that undo returns to. Scene coordinates.
     void placeAt(QPointF position);
 
-    // The live record, owned by the item.
+    // Returns the live record, which the item owns.
     TText* getItemTText() const;
-    // A new copy of the record with the plain text set as its text and without what is only previewed; the
+    // Returns a new copy of the record with the plain text set as its text and without any preview. The
     // caller owns it.
     TText* getTextList() const;
-    // The style that the next character of an emptied object takes; owned by the item.
+    // Returns the style of the next character typed into an emptied object; the item owns it.
     TText* getLastAlpaTextStyleValue() const;
     void setLastAlpaTextStyleValue(TText& style);
 
-    // Lays the record out: after construction, or after the record was changed from outside.
+    // Lays the record out. Call after construction and after the record was changed from outside.
     void initShowText();
-    // Shows a copy of the record; places the parent. A negative cursor position leaves the cursor.
+    // Shows a copy of the record and places the parent. A negative cursor position leaves the cursor where it
+    // is.
     void resetDocument(TText* record, int cursorPos);
 
-    // 0 selected as an object, 1 has a selection, 2 caret without selection, -1 not active.
+    // Returns 0 when selected as an object, 1 with a selection, 2 with a caret and no selection, -1 when not
+    // active.
     int getStatusId() const;
     int getBoundingLineStatus() const;
     int getFocusFlag() const override { return m_focusFlag; }
@@ -77,55 +79,56 @@ public:
     bool isHandleCaret() const;
     bool isDoubleClickedSelection() const;
 
-    // Style changes; source holds one style per changed character, property ids are those of StyleProperty
-    // and flags those of UndoFlag. Only a committed change is a step of undo.
+    // Change the style. source holds one style per changed character, property ids are those of StyleProperty
+    // and flags those of UndoFlag. Only a committed change becomes an undo step.
     void changeAllStyleWhenSelectionMode(TText* source, int id, bool overall, int undoFlag);
     void changeAllStyleWhenEditMode(TText* source, int id, bool overall, int undoFlag);
     void changeAllStyleWhenHasSelection(TText* source, int id);
     void changePartStyleWhenHasSelection(TText* source, int id, int undoFlag);
     void saveStyleForNextInsert(TText* style, int undoFlag, int id);
-    // Gives back every character's own style after previews; does nothing without one.
+    // Restores every character's style from before the preview; does nothing without one.
     void cancelPreview();
 
-    // Row of the font tables, shared by all objects.
+    // Sets the row of the font tables, which all objects share.
     void setInputLanguage(int row);
-    // 1: the first character of an empty object takes the family used last for its script.
+    // Sets how the family of the first character is chosen: with 1 the first character of an empty object
+    // takes the family used last for its script.
     void setFontFamilyEnsureMode(int mode);
-    // ratio: raster pixels per stored pixel; big: laid out for the 1920 raster.
+    // Sets the scale of the layout. ratio: raster pixels per stored pixel; big: laid out for the 1920 raster.
     void setRadio(double ratio, bool big);
-    // True crops boundingRect() to 100 pixels around the raster.
+    // Sets whether boundingRect() is limited to the raster and 100 pixels around it.
     void setBoundingRectFlag(bool flag);
 
-    // The touch that the object has is cancelled: nothing is chosen or edited by it, and a dragged object
-    // returns to where it was.
+    // Cancels the current touch: it selects and edits nothing, and a dragged object returns to where it was.
     void cancelTouch();
     void initNewTextSelectAll();
     void changeItemToSolidLineState();
     void pushLastEditTextIntoStack();
-    // Whether there is typing that is not part of an undo step yet.
+    // Returns whether there is typing that is not part of an undo step yet.
     bool isTyping() const;
-    // Forgets typing that has not become a step: the object is about to be hidden.
+    // Drops the typing that is not part of an undo step yet, since the object is about to be hidden.
     void discardBurst();
-    // Cursor of the soft keyboard: mode 0 places the cursor, 1 selects from begin to end, 2 selects all.
+    // Handles a request of the soft keyboard: mode 0 places the cursor, 1 selects from begin to end, 2
+    // selects all.
     void getSelectionInfo(int begin, int end, int current, int mode);
     void showCurrentTextStyle();
 
-    // Empty once simplified.
+    // Returns whether the text is empty or consists of white space only.
     bool isBlank() const;
 
     int type() const override { return Type; }
     QRectF boundingRect() const override;
     void paint(QPainter* painter, const QStyleOptionGraphicsItem* option, QWidget* widget) override;
-    // Updates the frame with the item.
+    // Repaints the frame together with the item.
     void update(const QRectF& rect = QRectF());
 
-    // Where the positions of the text stand, in item coordinates.
+    // Returns the positions of the carets, in item coordinates.
     CaretGeometry& carets();
-    // Another number whenever what is drawn may have changed.
+    // Returns a number that changes whenever what is drawn may have changed.
     quint64 contentVersion() const;
     double canvasRatio() const override;
     QGraphicsDropShadowEffect* shadowEffect() const { return m_shadowEffect; }
-    // The rectangle of the layout, whatever the bounding rect flag.
+    // Returns the rectangle of the layout, which does not depend on the bounding rect flag.
     QRectF layoutRect() const { return QGraphicsTextItem::boundingRect(); }
     void parentFollows() override;
 
@@ -137,13 +140,13 @@ public Q_SLOTS:
     void slotObjectDisplayInputLanguage(SystemSetupDef::emInputLanguageType language);
 
 Q_SIGNALS:
-    // Old and new record, old and new last style. Valid during the call only.
+    // Reports old and new record, old and new last style. They are valid during the call only.
     void signalObjectContentsEdited(TText* oldText, TText* newText, TText* oldLast, TText* newLast);
-    // The style at the cursor or of the selection. Valid during the call only.
+    // Reports the style at the cursor or of the selection. It is valid during the call only.
     void signalNotifyPropertyAreaObjectSelectionStyleChange(TText* style);
-    // Whether shadow and align, and whether the move buttons apply.
+    // Reports whether shadow and align, and whether the move buttons are available.
     void signalNotifyTextPropertyAreaObjectSelectionMode(bool shadowAndAlign, bool move);
-    // The family that is not installed.
+    // Reports a family that is not installed.
     void signalShowMessageWhenUsingDefaultFont(QString family);
     void signalObjectPositionChanged(int id, QPointF from, QPointF to);
     // Opens the keyboard for the item, or closes it when null.
@@ -156,7 +159,7 @@ Q_SIGNALS:
     void signalObjectSelectedHasChanged(QGraphicsItem* item);
     void signalObjectHasLostFocus(GraphicsText* item);
     void signalGetSceneInputLanguage(GraphicsText* item);
-    // What is selected or written is about to change from outside: a preview has to end first.
+    // Emitted before the selection or the text is changed from outside: previews have to end first.
     void signalEndPreview();
 
 protected:
@@ -203,7 +206,7 @@ private:
 
     void initDataForGraphicsText();
     void makeUnits();
-    // The keyboard was closed by the operator.
+    // Called when the operator closed the keyboard.
     void keyboardClosed();
     QRectF limitedBoundingRect() const;
     void paintFrame(QPainter* painter);
@@ -213,7 +216,7 @@ private:
     TextPlacement m_placement;
     std::unique_ptr<TextStyleEditor> m_styleEditor;
     std::unique_ptr<TouchTextEditor> m_touchEditor;
-    // Owned by the item through setGraphicsEffect.
+    // Owned by the item, see setGraphicsEffect().
     QGraphicsDropShadowEffect* m_shadowEffect = nullptr;
     int m_focusFlag = TextObjectConstants::FocusNone;
     bool m_parentObject = false;

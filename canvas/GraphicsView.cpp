@@ -70,7 +70,7 @@ QPoint GraphicsView::fingerPosition() const
     return m_finger.positionIn(viewport()).toPoint();
 }
 
-// The object under the finger releases it; otherwise it would receive every later touch.
+// Releases the mouse grab of the object under the finger, which would otherwise receive every later touch.
 void GraphicsView::rest()
 {
     m_clickTimer.stop();

@@ -7,8 +7,8 @@
 
 class QTouchEvent;
 
-// View of the canvas: turns the first finger into mouse events for the scene. Two touches within 350 ms are a
-// double click, movements within the drag distance are jitter and dropped. A touch that is cancelled chooses
+// The view of the canvas: turns the first finger into mouse events for the scene. Two touches within 350 ms
+// are a double click; movements within the drag distance are dropped as jitter. A cancelled touch selects
 // nothing, and an object that it dragged returns to its place.
 class GraphicsView : public QGraphicsView
 {
@@ -20,11 +20,11 @@ public:
     void cancelTouch() { m_finger.cancel(); }
 
 Q_SIGNALS:
-    // A finger was lifted; sent before the release reaches the scene.
+    // Emitted when a finger was lifted, before the release reaches the scene.
     void deleteEmptyItem();
 
 public Q_SLOTS:
-    // Ends the time in which a second touch makes a double click.
+    // Called when the time has passed in which a second touch makes a double click.
     void mouseClick();
 
 protected:

@@ -1,16 +1,16 @@
 #pragma once
 
-// What the canvas asks of the window that shows it. The window installs itself; without one the canvas counts
-// as hidden. GUI thread only.
+// What the canvas needs to know about the window that shows it. The window installs itself; without one the
+// canvas counts as hidden. GUI thread only.
 class ICanvasHost
 {
 public:
     virtual ~ICanvasHost() = default;
 
-    // True while the operator can see the window.
+    // Returns whether the operator can see the window.
     virtual bool windowIsVisible() const = 0;
 
     static ICanvasHost* instance();
-    // The caller keeps ownership and clears the pointer before the host dies.
+    // Sets the host, which the caller keeps owning. Call with null before the host is destroyed.
     static void setInstance(ICanvasHost* host);
 };

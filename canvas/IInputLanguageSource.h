@@ -4,9 +4,9 @@
 
 #include <QObject>
 
-// Tells the text objects which input language the keyboard has. The application's system controller derives
-// from it and installs itself; text objects made without a source keep the language that they start with. GUI
-// thread only.
+// Reports the input language of the keyboard to the text objects. The application's system controller derives
+// from it and installs itself; text objects made without a source keep their initial language. GUI thread
+// only.
 class IInputLanguageSource : public QObject
 {
     Q_OBJECT
@@ -14,7 +14,7 @@ public:
     using QObject::QObject;
 
     static IInputLanguageSource* instance();
-    // The caller keeps ownership; the pointer is cleared by itself when the source dies.
+    // Sets the source, which the caller keeps owning. It is reset when the source is destroyed.
     static void setInstance(IInputLanguageSource* source);
 
 Q_SIGNALS:

@@ -5,7 +5,7 @@
 class QTextCursor;
 class TShadow;
 
-// What the units of a text object ask of the item that shows it. The item implements it and outlives its
+// What the units of a text object need from the item that shows it. The item implements it and outlives its
 // units. GUI thread only.
 class ITextSurface
 {
@@ -15,28 +15,28 @@ public:
     virtual QTextCursor selection() const = 0;
     virtual void select(const QTextCursor& cursor) = 0;
 
-    // One of TextObjectConstants::FocusState.
+    // Returns one of TextObjectConstants::FocusState.
     virtual int getFocusFlag() const = 0;
     virtual void setFocusFlag(int flag) = 0;
-    // Whether text can be typed into the object.
+    // Returns whether text can be typed into the object.
     virtual bool isWritable() const = 0;
     virtual void setWritable(bool writable) = 0;
     virtual void takeFocus() = 0;
     virtual void giveUpFocus() = 0;
 
-    // Raster pixels per stored pixel.
+    // Returns the raster pixels per stored pixel.
     virtual double canvasRatio() const = 0;
-    // Lets Qt's text item handle a mouse or key event as one of the type; other types are ignored. The two
-    // may differ: Qt hands a double click on an object without focus on as a press.
+    // Lets Qt's text item handle a mouse or key event as one of the given type; other types are ignored. The
+    // two types may differ: Qt treats a double click on an object without focus as a press.
     virtual void handleByTextItem(QEvent::Type type, QEvent& event) = 0;
 
     // Call before the layout changes: the frame of the pair changes with it.
     virtual void announceGeometryChange() = 0;
-    // Call after the layout changed: what was kept of it is out of date.
+    // Call after the layout changed: discards what was computed from it.
     virtual void layoutChanged() = 0;
     // Copies focus, interaction and layout width to the parent and repaints it.
     virtual void parentFollows() = 0;
     virtual void repaint() = 0;
-    // An offset of (0,0) switches the shadow off.
+    // Shows the shadow; an offset of (0,0) switches it off.
     virtual void showShadow(const TShadow& shadow) = 0;
 };

@@ -9,9 +9,9 @@
 class QWidget;
 class TitlerToolFactory;
 
-// Shows numbered message boxes, whose texts and windows live in the message service. The application installs
-// the controller by setProvider; until then getInstance() is null and callers go on without a message. GUI
-// thread only.
+// Shows numbered message boxes, whose texts and windows belong to the message service. The application
+// installs the controller with setProvider(); until then getInstance() is null and callers continue without a
+// message. GUI thread only.
 class MessageBoxController : public QObject
 {
     Q_OBJECT
@@ -20,7 +20,8 @@ public:
 
     static MessageBoxController* getInstance();
     static void clearInstance();
-    // Neither function may be null once one is given; both null removes the provider.
+    // Sets the functions of the provider. Either both are given, or both are null, which removes the
+    // provider.
     static void setProvider(MessageBoxController* (*get)(), void (*clear)());
 
 public Q_SLOTS:

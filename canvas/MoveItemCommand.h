@@ -4,7 +4,7 @@
 
 #include <QPointF>
 
-// A move of one object; Scene coordinates.
+// A move of one object. Scene coordinates.
 class MoveItemCommand : public CanvasCommand
 {
 public:

@@ -89,7 +89,7 @@ NewTextStyle::FirstCharacter NewTextStyle::firstCharacter()
     FirstCharacter first;
     QString family = rememberedFamily();
     if (m_panelTold) {
-        // What the panel shows holds. It shows the family of a new language until a text is selected.
+        // The panel takes precedence. It shows the family of a new language until a text is selected.
         if (m_languageChanged && family == ofLanguage)
             first.ensureMode = 1;
     } else if (!m_familyOfModel.isEmpty()) {

@@ -6,43 +6,46 @@
 
 class FontStyle;
 
-// The style that a new text object starts with: what the panel shows; until the panel has reported that, the
-// change that it sent last, at first the style remembered from the last run. The family may come from the
-// input language or the model instead.
+// The style of a new text object: the style that the panel has reported; before it has reported one, the
+// change that it sent last, and at first the style remembered from the last run. The family may come from the
+// input language or the model of the appliance instead.
 class NewTextStyle
 {
 public:
-    // sample: the text of the first record, one style per character. font: the remembered style.
+    // sample: the text of the first record, one style per character. font: the style remembered from the last
+    // run.
     NewTextStyle(const QString& sample, const FontStyle& font);
 
-    // The panel changed an object: its first style counts. Nothing without characters.
+    // Call when the panel has changed an object: keeps the first style of the change. Does nothing without
+    // characters.
     void rememberChange(const TText& style);
-    // Call when a property of an object has changed, one of TextObjectConstants::StyleProperty: from then on
-    // the family is that of the panel.
+    // Call when a property of an object has changed, one of TextObjectConstants::StyleProperty. The family of
+    // the last change of language is not used any more then and, if the property is the family, nor is that
+    // of the model.
     void propertyChanged(int id);
-    // Call before the panel is asked what it shows.
+    // Call before the panel is asked for its style.
     void askPanel() { m_panelTold = false; }
-    // The panel reports what it shows: shadow, align and the style of one character.
+    // Keeps the style that the panel reports: shadow, align and the style of one character.
     void rememberProperty(const TText& style);
 
-    // The family that the model of the appliance asks for; empty: none.
+    // Sets the family that the model of the appliance requires; empty for none.
     void setFamilyOfModel(const QString& family) { m_familyOfModel = family; }
-    // Row of the tables of InputLanguageFonts.
+    // Sets the row of the tables of InputLanguageFonts.
     void setLanguageRow(int row);
     int languageRow() const { return m_languageRow; }
 
-    // What an emptied object takes for the next character, too.
+    // Returns the style of the next character of an emptied object, which is also that of a new one.
     TText& lastTextStyle() { return m_last; }
 
-    // Shadow and align of a new object; the rest of the record stays.
+    // Sets shadow and align of a new object; the rest of the record stays.
     void applyTo(TText& record) const;
-    // A record of one character, and how its family follows the script of what is typed; see
+    // A record of one character, and the mode in which its family follows the script of what is typed; see
     // GraphicsText::setFontFamilyEnsureMode().
     struct FirstCharacter {
         TText record;
         int ensureMode = 2;
     };
-    // The style of the first character. A new language counts for one text only.
+    // Returns the style of the first character. A change of language affects one text only.
     FirstCharacter firstCharacter();
 
 private:

@@ -20,14 +20,14 @@ using namespace TextObjectConstants;
 namespace
 {
 
-// Styles that the document lays out alike.
+// Returns whether the document lays both styles out in the same way.
 bool sameLayout(const TextStyle& a, const TextStyle& b)
 {
     return a.fontIsTheSame(b) && a.getTextKerning() == b.getTextKerning() &&
            (a.isTextEdge() != 0) == (b.isTextEdge() != 0);
 }
 
-// Left and right of a line each.
+// Returns the margin on each side of a line.
 double marginOf(double lineHeight)
 {
     return MARGIN_SHARE_OF_LINE * lineHeight / 2.0;
@@ -39,8 +39,8 @@ RecordLayout::RecordLayout(const TextObjectParts& parts) : m_parts(parts)
 {
 }
 
-// Estimates the margins from the tallest font, so that the document need not be laid out again for them. Only
-// a line of mixed fonts may be taller.
+// Estimates the margins from the tallest font, which saves a second layout. Only a line of mixed fonts may be
+// taller.
 double RecordLayout::expectedMargin() const
 {
     double tallest = 0.0;
@@ -104,7 +104,7 @@ void RecordLayout::applyFormats(int begin, int end)
 
 void RecordLayout::setCaretHeight(const TextStyle& style)
 {
-    // The height of an empty line comes from the default font; setting it lays the document out.
+    // The height of an empty line is that of the default font; setting this font lays the document out.
     const QFont before = m_parts.document.defaultFont();
     QFont font = before;
     font.setFamily(QString::fromStdString(style.getFontFamily()));
@@ -125,9 +125,8 @@ void RecordLayout::updateWidthAndAlign()
     m_parts.surface.layoutChanged();
 }
 
-// The width that the document has without a text width. Lines never wrap, so they have it whatever width is
-// set, and the document need not be laid out twice. Margins count in 64ths of a pixel, as the layout rounds
-// them.
+// Returns the width of the document without a text width. Lines never wrap, so the text width does not change
+// it, and a second layout is not needed. Margins are rounded to 64ths of a pixel, as in the layout.
 double RecordLayout::naturalWidth() const
 {
     const auto rounded = [](double margin) { return std::floor(margin * 64.0) / 64.0; };

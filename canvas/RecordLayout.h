@@ -4,27 +4,27 @@
 
 class TextStyle;
 
-// Lays the Qt document of a text object out as its record says: text, formats, margins, width and alignment.
-// Changes of the document that are made here are not typing: the caller keeps them from being read back.
-// Lengths are item coordinates. GUI thread only.
+// Lays out the Qt document of a text object according to its record: text, formats, margins, width and
+// alignment. The changes that it makes in the document are not typing: the caller has to keep them from being
+// read back into the record. Lengths are item coordinates. GUI thread only.
 class RecordLayout
 {
 public:
     explicit RecordLayout(const TextObjectParts& parts);
 
-    // Replaces the text of the document by that of the record. updateWidthAndAlign() has to follow.
+    // Replaces the text of the document by that of the record. Call updateWidthAndAlign() after it.
     void insertRecord();
-    // Formats the characters from begin to before end as their styles say.
+    // Applies the styles of the characters from begin to before end.
     void applyFormats(int begin, int end);
-    // The height of an empty document, from the font of the style.
+    // Sets the height of an empty document, from the font of the style.
     void setCaretHeight(const TextStyle& style);
 
     // Fits margins, width and alignment to the text. An object that is centred or aligned right keeps its
     // centre or its right edge where it was at the last call.
     void updateWidthAndAlign();
-    // The next call of updateWidthAndAlign() leaves the object where it is.
+    // Makes the next call of updateWidthAndAlign() leave the object where it is.
     void forgetWidth() { m_lastWidth = 0.0; }
-    // Call after characters were removed: while the document reports that, it has not laid itself out yet.
+    // Call after characters were removed: the document reports the removal before it has laid itself out.
     void finishLayout();
 
 private:

@@ -5,9 +5,9 @@
 class QGraphicsRectItem;
 class QGraphicsScene;
 
-// The two rectangles that show how much of a picture every receiver shows: 90% and 80% of the 1280 by 720
-// canvas. Each is a dotted white line over a solid black one. The scene owns the items; call forget() before
-// it is cleared.
+// The two rectangles that mark the area that every receiver shows: 90% and 80% of the 1280 by 720 canvas.
+// Each is a dotted white line over a solid black one. The scene owns the items; call forget() before it is
+// cleared.
 class SafeAreaLines
 {
 public:

@@ -27,7 +27,7 @@ bool hasFolder(const RefusedWrites::File& file)
     return QFileInfo(QFileInfo(QString::fromStdString(file.path)).path()).isDir();
 }
 
-// The file manager is told of pictures when they are in their place.
+// Reports the titles whose pictures were written to the file manager.
 void reportPictures(const std::vector<RefusedWrites::File>& written)
 {
     std::set<std::string> titles;
@@ -46,7 +46,8 @@ void reportPictures(const std::vector<RefusedWrites::File>& written)
 
 SaveOutage* SaveOutage::instance()
 {
-    static SaveOutage* const outage = new SaveOutage; // threads may report to it until the process ends
+    // Never destroyed, since threads may report to it until the process ends.
+    static SaveOutage* const outage = new SaveOutage;
     return outage;
 }
 

@@ -6,11 +6,11 @@
 #include <string>
 #include <vector>
 
-// The time in which the disk refuses what is saved. Reports it to the operator once, tries again every few
-// seconds and logs which files are concerned. The files themselves are kept by RefusedWrites, and by
-// FileSyncQueue where the disk failed after they were in their place.
+// A time in which files cannot be written to the disk. Reports it to the operator once, retries every few
+// seconds and logs the files concerned. The contents of the files are kept by RefusedWrites, or by
+// FileSyncQueue when a file was renamed into place but could not be synced.
 //
-// One object for the process, made in the GUI thread when it is first used; never destroyed. GUI thread only.
+// One object for the process, made in the GUI thread on first use and never destroyed. GUI thread only.
 class SaveOutage : public QObject
 {
     Q_OBJECT
@@ -20,12 +20,12 @@ public:
 
     static SaveOutage* instance();
 
-    // Tries again to write all that the disk has refused. Returns whether nothing of it is left.
+    // Retries all refused writes. Returns whether none is left.
     bool retry();
 
 private:
-    // A file whose folder is away may belong to a folder that was renamed, of which a notice is on its way:
-    // the operator hears of it when it has been tried again.
+    // Whether the operator is told of files whose folder is missing. The folder may have been renamed, with
+    // the notice still on its way, so these files are reported only after a retry.
     enum class FoldersAway { Pardoned, Told };
 
     SaveOutage();
@@ -37,8 +37,8 @@ private:
     void logRefused();
 
     QTimer m_timer;
-    std::set<std::string> m_logged; // paths
-    unsigned long m_outage = 0;     // the last one that RefusedWrites counted
+    std::set<std::string> m_logged; // paths of the files logged
+    unsigned long m_outage = 0;     // number of the last outage that RefusedWrites counted
     bool m_isTold = false;
     bool m_hasSyncFailed = false;
 };

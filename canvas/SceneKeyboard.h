@@ -6,17 +6,17 @@
 class GraphicsText;
 class QWidget;
 
-// Asks for the soft keyboard on behalf of the text objects of a scene. GUI thread only.
+// Opens and closes the soft keyboard for the text objects of a scene. GUI thread only.
 class SceneKeyboard
 {
 public:
-    // The object that the next request is for; null closes the keyboard.
+    // Sets the object for the next request; null closes the keyboard.
     void setItem(GraphicsText* item) { m_item = item; }
-    // The next request is for a new object: the keyboard starts afresh.
+    // Marks the next request as one for a new object: the keyboard starts with a cleared state.
     void expectNewText() { m_isNewText = true; }
 
-    // Opens the keyboard for the object, which describes itself to it, or closes it. view: the widget that
-    // shows the object; null: nothing is opened. title: that of the keyboard.
+    // Opens the keyboard with a description of the object, or closes it. view: the widget that shows the
+    // object; with null nothing is opened. title: the title of the keyboard.
     void request(QWidget* view, const QString& title);
 
 private:

@@ -25,14 +25,14 @@ namespace
 {
 
 constexpr int PICTURE_POLL = 5;          // ms
-constexpr int LONGEST_IDLE_TIME = 30000; // ms in which not one title gets its pictures
+constexpr int LONGEST_IDLE_TIME = 30000; // ms without the pictures of any title being finished
 
 } // namespace
 
 ShownTitle::ShownTitle(std::unique_ptr<IThumbnailRender> render)
     : m_controller(std::make_unique<CanvasController>()), m_render(std::move(render))
 {
-    SaveOutage::instance(); // from here on titles may be saved
+    SaveOutage::instance(); // titles may be saved from now on
 }
 
 ShownTitle::~ShownTitle() = default;
@@ -55,11 +55,11 @@ QString ShownTitle::path() const
 
 bool ShownTitle::save(const TextObjectList& texts, const GraphicsPixmap* background)
 {
-    // An emptied title is saved; one that was empty all the time has nothing to be saved.
+    // A title whose texts were deleted is saved; one that has been empty since it was opened is not.
     if (!m_archive || (texts.enableItems().isEmpty() && m_archive->text().empty()))
         return false;
     const bool isSaved = writeFile(texts, background);
-    if (isSaved && !RefusedWrites::isEmpty()) // the disk takes again what it refused before
+    if (isSaved && !RefusedWrites::isEmpty()) // the disk can be written again
         SaveOutage::instance()->retry();
     if (m_render)
         m_render->makeThumbnail(m_archive.get(), false);
@@ -68,7 +68,7 @@ bool ShownTitle::save(const TextObjectList& texts, const GraphicsPixmap* backgro
 
 bool ShownTitle::writeFile(const TextObjectList& texts, const GraphicsPixmap* background)
 {
-    // Oldest first, so that the order in the file does not change with the stacking of the moment.
+    // Oldest first, so that the order in the file does not depend on the stacking order.
     std::vector<TText*> records;
     const QList<GraphicsText*> enabled = texts.enabledTexts();
     for (GraphicsText* item : texts.listed()) {
@@ -93,7 +93,8 @@ bool ShownTitle::writeFile(const TextObjectList& texts, const GraphicsPixmap* ba
 void ShownTitle::makeNeededPictures()
 {
     const QFileInfo title(path());
-    // A title that is not there was deleted, unless its whole folder is away: that may have another name.
+    // A title that does not exist was deleted, unless its whole folder is missing: the folder may have been
+    // renamed.
     const bool needed = m_archive && m_picturesNeeded && (title.exists() || !title.dir().exists());
     if (needed && m_render)
         m_render->makeThumbnail(m_archive.get(), true);
@@ -135,8 +136,8 @@ bool ShownTitle::waitForPictures() const
     return isEditFinish();
 }
 
-// A picture may be missing after a disk was full, or when a copy was cut off; one that is older than the
-// title shows what it said before the process was killed.
+// Returns whether a picture is missing or older than the title. A full disk or an interrupted copy leaves a
+// picture out, and a killed process leaves one from before the last change.
 bool ShownTitle::lacksPictures() const
 {
     const QFileInfo title(path());
@@ -153,7 +154,7 @@ bool ShownTitle::folderRenamed(const QString& before, const QString& after)
 {
     const QString from = QDir::cleanPath(before);
     const QString to = QDir::cleanPath(after);
-    if (QFileInfo::exists(to) || !QFileInfo::exists(from)) { // else the notice is wrong, or early
+    if (QFileInfo::exists(to) || !QFileInfo::exists(from)) { // otherwise the notice is wrong, or early
         RefusedWrites::folderRenamed(from.toStdString(), to.toStdString());
         if (m_render)
             m_render->folderRenamed(from, to);

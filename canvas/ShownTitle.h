@@ -9,34 +9,35 @@ class GraphicsPixmap;
 class IThumbnailRender;
 class TextObjectList;
 
-// The copy of the title that the canvas shows: writes its file and asks for its pictures. GUI thread only.
+// The copy of the title that the canvas shows: writes the title file and has its pictures made. GUI thread
+// only.
 class ShownTitle
 {
 public:
-    // Takes the picture maker over; null: no pictures are made and isEditFinish() is always true.
+    // Takes ownership of the picture maker. With null no pictures are made and isEditFinish() is always true.
     explicit ShownTitle(std::unique_ptr<IThumbnailRender> render);
     ~ShownTitle();
     ShownTitle(const ShownTitle&) = delete;
     ShownTitle& operator=(const ShownTitle&) = delete;
 
-    // Null while no title is shown.
+    // Returns the copy, or null while no title is shown.
     Archive* archive() const { return m_archive.get(); }
-    // Keeps a copy; the copy itself stays as it is.
+    // Keeps a copy of the title.
     void show(const Archive& archive);
-    // Nothing is saved; a later save writes nothing.
+    // Drops the copy without saving; a later save writes nothing.
     void forget();
 
     // Writes the texts and the place of the background (null: none), and makes the small picture. Returns
-    // false when there is nothing to be saved.
+    // false when there is nothing to save.
     bool save(const TextObjectList& texts, const GraphicsPixmap* background);
 
-    // The pictures are out of date.
+    // Marks the pictures as out of date.
     void setPicturesNeeded() { m_picturesNeeded = true; }
     // Makes the pictures if they are out of date.
     void makeNeededPictures();
-    // Makes them if one is missing or older than the title.
+    // Makes the pictures if one is missing or older than the title.
     void makeLackingPictures();
-    // Makes the small picture at once, the others later.
+    // Makes the small picture at once; the others are made later.
     void makeSmallPicture();
 
     bool isEditFinish() const;
@@ -44,8 +45,8 @@ public:
     // they are written when it works again. Returns isEditFinish().
     bool waitForPictures() const;
 
-    // Call when a folder was renamed: what is still to be saved in it is saved there. Returns whether it is
-    // the folder of the title shown.
+    // Call when a folder was renamed: pending writes for it go to its new path. Returns whether the title
+    // shown is in that folder.
     bool folderRenamed(const QString& before, const QString& after);
 
 private:

@@ -4,17 +4,17 @@
 
 class GraphicsText;
 
-// How a text object describes itself to the soft keyboard: the name that it bears as a field.
+// Makes the object name with which a text object, as an input field, describes itself to the soft keyboard.
 class SoftKeyboardField
 {
 public:
-    // A new object: the keyboard starts afresh.
+    // Describes a new object: the keyboard starts with a cleared state.
     static QString newText(const QString& title, const QString& text);
-    // A double tap has selected the whole text.
+    // Describes an object whose whole text was selected by a double tap.
     static QString doubleClick(const QString& title, const QString& text);
-    // Cursor and selection of the item as they are.
+    // Describes the current cursor and selection of the item.
     static QString commonState(const QString& title, const QString& text, const GraphicsText& item);
 
-    // The end of the selection that is not the cursor; the cursor itself without a selection.
+    // Returns the end of the selection that is not the cursor; without a selection the cursor.
     static int getCursorSelectionStartPosition(const GraphicsText& item);
 };

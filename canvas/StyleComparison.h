@@ -2,11 +2,12 @@
 
 class TText;
 
-// Whether all characters of a record look alike, as far as the property panel is concerned.
+// Compares the characters of a record as far as the property panel shows their style.
 class StyleComparison
 {
 public:
-    // True for fewer than two characters. An empty text or a number of -1 in the first character agrees with
-    // everything, and bold, italic and outline disagree only where the first character has them.
+    // Returns whether all styles are equal; true for fewer than two characters. An empty text or a number of
+    // -1 in the first character matches everything; bold, italic and outline are compared only when the first
+    // character has them.
     static bool isTheSame(const TText& style);
 };

@@ -12,7 +12,7 @@ using namespace TextObjectConstants;
 namespace
 {
 
-// Positions beyond these are no places on a canvas; a scene index cannot hold them.
+// Positions beyond this come from damaged files; a scene index cannot hold them.
 constexpr float PlaceLimit = 100000.0F;
 
 float usablePlace(float value)
@@ -122,7 +122,7 @@ void StyleDocument::normalise(TText& record)
             result.back()->setText(storedText(text, c).toStdString());
             if (!pair)
                 continue;
-            // The second half has a style of its own when the record was made here.
+            // In records made by this program the second half has a style of its own.
             const bool hasOwn = text.size() == 2 && i + 1 < source.size() && source[i + 1] &&
                                 source[i + 1]->getText().empty();
             result.push_back(new TextStyle(hasOwn ? *source[i + 1] : *source[i]));
@@ -178,7 +178,7 @@ void StyleDocument::copyNeighbourStyle(int position, bool startOfLine, QChar add
     out.setText(text);
     out.setAlphaDefaultFontOfInputLanguage(alphaDefault);
 
-    // A mark is drawn on its base and keeps the base's family.
+    // A mark is drawn on its base character and takes the family of the base.
     const QChar previous = characterAt(index);
     if (previous == QLatin1Char('\n') || added == QLatin1Char('\n') || isCombining(added))
         return;
@@ -362,7 +362,7 @@ void StyleDocument::setItemShadowInfo(TText& record)
 {
     if (record.textItems().empty())
         return;
-    // Sizes that no tool can set come from damaged files only, and would make shadows larger than memory.
+    // Larger sizes come from damaged files only and would make shadows too large for the memory.
     const int size = std::clamp(getMinmumSize(record), 0, MAXIMUM_FONT_SIZE);
     const int step = getRadioValueofStandardSize(size);
     const int offset = int(step * STANDARD_OFFSET);

@@ -4,8 +4,8 @@
 #include <QRectF>
 #include <QString>
 
-// Numbers and looks shared by the units of a text object. Lengths are pixels of the raster that the object is
-// laid out for (1280 by 720 on the canvas) unless said otherwise.
+// Constants shared by the units of a text object. Lengths are pixels of the raster that the object is laid
+// out for (1280 by 720 on the canvas) unless said otherwise.
 namespace TextObjectConstants
 {
 
@@ -24,12 +24,12 @@ inline constexpr QRectF BIG_SCENE_RECT{0.0, 0.0, 1920.0, 1080.0};
 // Stored sizes are pixels of the 1920 raster; the canvas shows them at two thirds.
 inline constexpr double SCENEPERCENTAGE = 0.6666666666666666;
 inline constexpr double CENTERPERCNTAGE = 0.5;
-// How far an object may lie outside the raster, and how much of it has to stay inside.
+// How far an object may extend beyond the raster, and how much of it has to stay inside.
 inline constexpr double LIMITEDNUM = 100.0;
 
 inline constexpr double DOCUMENT_MARGIN = 27.0;
 inline constexpr double BIG_DOCUMENT_MARGIN = 40.5;
-// Both margins beside a line together, as part of its height: room for the handles.
+// Left and right margin of a line together, as a fraction of its height: room for the handles.
 inline constexpr double MARGIN_SHARE_OF_LINE = 0.6;
 inline constexpr double HANDLEPIXMAPWIDTH = 24.0;
 inline constexpr double HANDLEPIXMAPHEIGHT = 27.0;
@@ -41,10 +41,10 @@ inline constexpr double MINIMUM_BLUR_RADIUS = 1.0;
 inline constexpr int DEFAULT_MINIMUM_SIZE = 20;
 // The largest size that the panel offers.
 inline constexpr int MAXIMUM_FONT_SIZE = 999;
-// Text objects are drawn with this colour, whatever their record says.
+// Colour in which shadows are drawn, whatever the record contains.
 inline const QColor DROP_SHADOW_COLOR{0, 0, 0, 190};
 
-// Milliseconds of silence after which typing becomes one undo step.
+// Milliseconds without typing after which the typed text becomes one undo step.
 inline constexpr int EDIT_AUTO_SAVE_TIME = 5000;
 // Milliseconds.
 inline constexpr int LONG_PRESS_TIME = 1000;
@@ -74,10 +74,10 @@ enum StyleProperty {
     PropertyPosition = 11
 };
 
-// Undo flag of a style change: a preview leaves no step of undo and is taken back by Cancel.
+// Undo flag of a style change: a preview is not an undo step and is taken back by Cancel.
 enum UndoFlag { PreviewedChange = 0, CommittedChange = 1, CancelledChange = 2 };
 
-// Focus flag and bounding line status.
+// Values of the focus flag and of the bounding line status.
 enum FocusState { FocusNone = -1, FocusEdit = 0, FocusObject = 1 };
 
 } // namespace TextObjectConstants

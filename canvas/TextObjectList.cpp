@@ -97,7 +97,7 @@ void TextObjectList::restoreZ(GraphicsText* item)
 
 void TextObjectList::release(GraphicsText* item)
 {
-    // An input method may still be composing what belongs to the text.
+    // An input method may still hold uncommitted input for the text.
     KSInputContext* context = KSInputContext::instance();
     if (context && item->textInteractionFlags() == Qt::TextEditorInteraction)
         context->commit();

@@ -7,7 +7,7 @@ class QTextDocument;
 class StyleDocument;
 class TextPlacement;
 
-// What the units of one text object work on. All parts belong to the object and outlive its units.
+// The parts of one text object that its units work on. They belong to the object and outlive its units.
 struct TextObjectParts {
     QTextDocument& document;
     StyleDocument& styles;

@@ -18,16 +18,16 @@ using namespace TextObjectConstants;
 
 namespace
 {
-// Baseline of a character within the height of its line.
+// Position of the baseline within the height of a line.
 constexpr double BaselineShare = 0.85;
 constexpr double CaretShift = 1.0;
 constexpr double FrameRadius = 1.0;
-// Pixels; the font system keeps pictures of smaller characters.
+// Pixels; the font system caches bitmaps of smaller characters.
 constexpr int LargestBitmapGlyph = 64;
 const QColor SelectedFill(0, 128, 255, 77);
 const QColor EditFill(0, 0, 0, 77);
 
-// What the painter's device shows, in the painter's coordinates.
+// Returns the visible area of the painter's device, in the painter's coordinates.
 QRectF visibleArea(const QPainter& painter)
 {
     bool invertible = false;
@@ -76,10 +76,11 @@ void TextPainter::addGlyph(int position, const QString& text, const CaretGeometr
         glyph.edgeColor = CharacterFormat::color(style->textEdge().getEdgeColor());
         glyph.edgeWidth = CharacterFormat::outlineWidth(*style, m_ratio);
     }
-    // No glyph of a usable font reaches farther than this from its baseline.
+    // No glyph of a usable font extends farther than this from its baseline.
     const double extent = 2.0 * font.pixelSize() * double(text.size()) + glyph.edgeWidth;
     const QRectF reach(glyph.baseline - QPointF(extent, extent), QSizeF(2.0 * extent, 2.0 * extent));
-    // An outline and its glyph must fit exactly; else the font system draws small characters best.
+    // A glyph with an outline is drawn as a path, so that both fit exactly. Other small characters look best
+    // when the font system draws them.
     if (!glyph.path->hasPath() || (!glyph.edge && font.pixelSize() < LargestBitmapGlyph)) {
         addRuns(glyph, reach);
         return;
@@ -130,7 +131,7 @@ void TextPainter::collectGlyphs()
 {
     if (m_valid)
         return;
-    // Held until the new ones are made, so that a full cache does not make them again.
+    // Kept until the new glyphs are made, so that their paths stay available even when the cache is full.
     const std::vector<Glyph> previous = std::move(m_glyphs);
     m_glyphs.clear();
     m_runs.clear();
@@ -220,7 +221,7 @@ void TextPainter::prepareFrame(const QRectF& rect)
     m_frame.solid = QPainterPathStroker(QPen(Qt::black, ITEMBOUNDINGWIDTH)).createStroke(outline);
     m_frame.solid.setFillRule(Qt::WindingFill);
 
-    // A dotted pen with square caps: dots of two pen widths, one apart.
+    // Draws a dotted line with square caps: dots two pen widths long, one pen width apart.
     constexpr double pen = ITEMBOUNDINGWIDTH;
     m_frame.dots.clear();
     for (double x = rect.left(); x < rect.right(); x += 3.0 * pen) {

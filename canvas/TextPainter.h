@@ -21,29 +21,29 @@ class QTextDocument;
 class QTransform;
 class StyleDocument;
 
-// Paints one text object: outlines below glyphs, frames, selections. Keeps what it draws until the text, a
-// style or the layout changes. A character and the marks on it are drawn as one with the style of the
-// character, since a mark finds its base only in one font; each position keeps its own style in the record.
+// Paints one text object: outlines below glyphs, frames, selections. Caches what it draws until the text, a
+// style or the layout changes. A character and its marks are drawn together in the style of the character,
+// since a mark is placed on its base only within one font; in the record each position keeps its own style.
 // GUI thread only.
 class TextPainter
 {
 public:
-    // Both outlive this object.
+    // Keeps references to both, which must outlive this object.
     TextPainter(const QTextDocument& document, const StyleDocument& styles);
 
-    // Raster pixels per stored pixel.
+    // Sets the raster pixels per stored pixel.
     void setRatio(double ratio);
     double ratio() const { return m_ratio; }
-    // Call when text, styles or layout changed.
+    // Call after text, styles or layout changed.
     void invalidate();
-    // Another number whenever what is drawn may have changed.
+    // Returns a number that changes whenever what is drawn may have changed.
     quint64 contentVersion() const { return m_version; }
     CaretGeometry& carets() { return m_carets; }
 
     void drawItemText(QPainter* painter);
-    // Frame of a pair: status is that of the child, FocusEdit or FocusObject.
+    // Draws the frame of a pair: status is that of the child, FocusEdit or FocusObject.
     void drawItemBoundingRect(QPainter* painter, const QRectF& rect, int status);
-    // Highlights the selection of the cursor, with the colours of a text that has the focus or not.
+    // Highlights the selection of the cursor; hasFocus chooses the colours.
     void drawSelection(QPainter* painter, const QTextCursor& cursor, bool hasFocus);
 
 private:
@@ -60,22 +60,23 @@ private:
         QGlyphRun glyphs;
         QColor color;
     };
-    // A run while it is collected.
+    // A run whose glyphs are still being collected.
     struct PendingRun {
         QRawFont font;
         QColor color;
         QList<quint32> indexes;
         QList<QPointF> positions;
     };
-    // What is drawn in reading order: a glyph of its own or a run, by index.
+    // One drawing step in reading order: the index of a single glyph or of a run.
     struct Step {
         bool isRun;
         size_t index;
-        // Covers what the step draws, in item coordinates.
+        // Area that the step may draw on, in item coordinates.
         QRectF reach;
     };
 
-    // A frame as it is stroked. Dots are rectangles: as one path they cost ten times the solid line.
+    // A frame ready for drawing. Its dots are rectangles: a path of dots takes ten times as long as the solid
+    // line.
     struct Frame {
         QRectF rect;
         QPainterPath solid;

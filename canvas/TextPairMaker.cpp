@@ -12,7 +12,7 @@
 namespace
 {
 
-// More steps than objects could need to leave a free place.
+// More steps than any number of objects can require.
 constexpr int MaximumCascade = 1000;
 
 } // namespace

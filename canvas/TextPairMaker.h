@@ -12,23 +12,23 @@ class TText;
 class TextPairMaker
 {
 public:
-    // The scene outlives this object.
+    // Keeps a reference to the scene, which must outlive this object.
     explicit TextPairMaker(CanvasScene& scene);
 
-    // Shows the record at its place. Returns the child.
+    // Makes a pair that shows the record at its place. Returns the child.
     GraphicsText* make(TText& record) const;
-    // The same for an object that takes this style while it has no characters. ensureMode: see
+    // Makes a pair that has the style lastAlpha while it has no characters. ensureMode: see
     // GraphicsText::setFontFamilyEnsureMode().
     GraphicsText* make(TText& record, TText& lastAlpha, int ensureMode) const;
-    // A new object without characters, its middle at the place (scene coordinates).
+    // Makes a new object without characters, centred at the place (scene coordinates).
     GraphicsText* makeNew(int id, QPointF place, int z, NewTextStyle& style) const;
-    // Where the middle of a new object comes: the centre of the scene, or as many steps up and right of it as
-    // find no other object.
+    // Returns the centre of a new object: that of the scene, moved up and right in steps until no other
+    // object is there.
     QPointF getInitItemScenePosition() const;
     void connectToScene(GraphicsText* item) const;
 
 private:
-    // Not laid out yet.
+    // Makes both items without laying them out.
     GraphicsText* makeItems(TText& record) const;
 
     CanvasScene& m_scene;

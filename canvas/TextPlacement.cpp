@@ -9,8 +9,7 @@ using namespace TextObjectConstants;
 namespace
 {
 
-// How far the finger moves on after the limits of an object's left and upper side before it takes the object
-// along.
+// How far the finger moves beyond the limits on the left and at the top before the object follows it.
 constexpr double LeftReturnFactor = 2.0;
 constexpr double TopReturnFactor = 3.0;
 

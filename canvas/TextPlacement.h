@@ -7,44 +7,44 @@
 class QGraphicsItem;
 class QGraphicsTextItem;
 
-// Where a text object stands on the canvas and how far it may be moved. A pair is placed by its parent, the
-// child staying at (0,0) in it; an object without a parent is placed itself. Scene coordinates of the 1280
+// Places a text object on the canvas and limits how far it can be moved. A pair is placed by its parent, in
+// which the child stays at (0,0); an object without a parent is placed itself. Scene coordinates of the 1280
 // canvas unless said otherwise. GUI thread only.
 class TextPlacement
 {
 public:
-    // Side over which an object would leave the canvas.
+    // The side on which an object would leave the canvas.
     enum Side { Inside = 0, LeftSide = 1, RightSide = 2, TopSide = 3, BottomSide = 4 };
 
-    // The item holds the text and outlives this object.
+    // The item shows the text and must outlive this object.
     explicit TextPlacement(QGraphicsTextItem& item);
 
-    // The same for an object of the size at the position.
+    // Returns the side for an object of the size at the position.
     static Side itemIsOutOfRange(QPointF position, QSizeF size);
     Side itemIsOutOfRange(QPointF position) const { return itemIsOutOfRange(position, area().size()); }
-    // Places the object at the limit of that side. Returns the point from which the finger drags the
-    // object on.
+    // Places the object at the limit of that side. Returns the point from which the finger continues to drag
+    // the object.
     QPointF adjustItemPos(Side side);
 
     bool isPair() const;
-    // Of the item that places the object.
+    // Returns the position of the item that places the object.
     QPointF place() const;
     void setPlace(QPointF place);
-    // Of the text itself. It differs from place() while Qt drags the child.
+    // Returns the position of the child. It differs from place() while Qt drags the child.
     QPointF textPlace() const;
-    // Places a pair, the child back in its parent; an object without a parent stays.
+    // Places a pair and moves the child back to (0,0); does nothing without a parent.
     void placePair(QPointF place);
-    // Moves a pair to the side; an object without a parent stays.
+    // Moves a pair horizontally; does nothing without a parent.
     void shift(double distance);
-    // Moves a pair as far as the finger moved, the child back into its parent.
+    // Moves a pair by the step of the finger and the child back to (0,0).
     void followFinger(QPointF step);
     void setMovable(bool movable);
 
-    // The rectangle of the layout, in item coordinates.
+    // Returns the rectangle of the layout, in item coordinates.
     QRectF area() const;
     QPointF mapToScene(QPointF point) const;
 
-    // Whether the object was moved since this was last cleared.
+    // Returns whether the object was moved since clearMoved().
     bool isMoved() const { return m_moved; }
     void markMoved() { m_moved = true; }
     void clearMoved() { m_moved = false; }

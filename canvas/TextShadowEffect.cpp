@@ -10,7 +10,7 @@
 namespace
 {
 
-// Pixels; twice the canvas. Larger objects are mostly out of sight.
+// Pixels; twice the canvas. Most of a larger object is outside the view.
 constexpr qint64 LargestPicture = 2LL * 1480 * 920;
 
 } // namespace
@@ -26,7 +26,7 @@ bool TextShadowEffect::isWorthKeeping(const QPainter& painter) const
            !m_item.textCursor().hasSelection();
 }
 
-// The base class draws at the item's place on the device; here that place is the picture.
+// The base class draws at the item's position on the device; here the picture is drawn at that position.
 void TextShadowEffect::drawPicture(const QPainter& painter, QRect area)
 {
     m_picture = QPixmap(area.size());

@@ -9,24 +9,24 @@
 
 class GraphicsText;
 
-// The shadow of a text object. An object that is only moved looks as before, so what it shows in a window is
-// kept as a picture until its text, its styles or its shadow change; while it is edited it is drawn anew each
-// time. Other devices get no picture of their own: they are painted once. GUI thread only.
+// The shadow of a text object. Moving an object does not change its look, so the picture for a window is
+// cached until its text, its styles or its shadow change; while the object is edited it is drawn anew each
+// time. Nothing is cached for other devices, which are painted once. GUI thread only.
 class TextShadowEffect : public QGraphicsDropShadowEffect
 {
     Q_OBJECT
 public:
-    // The item outlives its effect.
+    // The item owns the effect and outlives it.
     explicit TextShadowEffect(GraphicsText& item);
 
 protected:
     void draw(QPainter* painter) override;
 
 private:
-    // All that the picture depends on.
+    // Everything that the picture depends on.
     struct Key {
         quint64 content = 0;
-        // With the fractions of a pixel of its place.
+        // Includes the fractional part of the item's position.
         QTransform transform;
         QPointF offset;
         double blurRadius = 0.0;
@@ -41,6 +41,6 @@ private:
     GraphicsText& m_item;
     Key m_key;
     QPixmap m_picture;
-    // Place of the picture, in device pixels from the whole pixels of the item's place.
+    // Rectangle of the picture in device pixels, relative to the item's position rounded to whole pixels.
     QRect m_area;
 };

@@ -25,7 +25,7 @@ int documentLength(const QTextDocument& document)
 
 } // namespace
 
-// While one lives, changes of the document come from here and are not read back.
+// While a guard exists, changes of the document are made here and are not read back.
 class TextStyleEditor::Guard
 {
 public:
@@ -94,7 +94,7 @@ void TextStyleEditor::documentChanged(int position, int removed, int added)
 {
     if (m_guard > 0 || (removed == 0 && added == 0))
         return;
-    // The document counts its last paragraph in when it is filled for the first time.
+    // The document includes its last paragraph break in the count when it is filled for the first time.
     removed = std::clamp(removed, 0, std::max(m_styles.count() - position, 0));
     added = std::max(documentLength(m_document) - (m_styles.count() - removed), 0);
     added = cutOffCharsBeyondMaxNum(position, added);
@@ -104,7 +104,7 @@ void TextStyleEditor::documentChanged(int position, int removed, int added)
 
     m_listener.textTyped();
     m_undoFlag = 1;
-    const bool previewTakenBack = m_styles.takeBackPreview(); // new characters do not take it over
+    const bool previewTakenBack = m_styles.takeBackPreview(); // new characters must not inherit the preview
     if (removed > 0 && added > 0) {
         replaceCharacters(position, removed, added);
     } else {
@@ -139,7 +139,7 @@ int TextStyleEditor::cutOffCharsBeyondMaxNum(int position, int added)
     const qsizetype characters = text.size() - text.count(QLatin1Char('\n'));
     if (characters <= CHARACTER_LIMIT)
         return added;
-    // Only what was just inserted may be removed, from the cursor backwards.
+    // Removes only what was just inserted, backwards from the cursor.
     QTextCursor cursor = m_surface.selection();
     const int end = cursor.position();
     int begin = end;
@@ -158,8 +158,8 @@ int TextStyleEditor::cutOffCharsBeyondMaxNum(int position, int added)
     return std::max(added - (end - begin), 0);
 }
 
-// With every event of an input method the document reports the whole paragraph, whose characters are the same
-// but for what was committed. They would lose their styles.
+// With every event of an input method the document reports the whole paragraph as replaced, although only the
+// committed characters changed. Replacing them all would lose their styles.
 void TextStyleEditor::trimUnchanged(int& position, int& removed, int& added) const
 {
     const QTextBlock block = m_document.findBlock(position);
@@ -331,7 +331,7 @@ void TextStyleEditor::changeAllStyleWhenHasSelection(const TText& source, int id
     TText before = m_styles.current();
     TText beforeLast = m_styles.lastAlpha();
     m_styles.setOverallProperty(id, source);
-    // Only place and shadow depend on these properties, so the text stays laid out.
+    // Only place and shadow depend on these properties, so no new layout of the text is needed.
     if (m_styles.isEmpty())
         m_layout.forgetWidth();
     m_layout.updateWidthAndAlign();
@@ -343,11 +343,11 @@ void TextStyleEditor::changeAllStyleWhenHasSelection(const TText& source, int id
     m_surface.parentFollows();
     TText after = m_styles.current();
     m_listener.contentsEdited(before, after, beforeLast, m_styles.lastAlpha());
-    // The next step starts here, also when the last change was a preview.
+    // The next undo step starts here, even if the last change was a preview.
     m_styles.refreshUndoBaseline();
     m_listener.selectionModeChanged(true, true);
     m_styles.forgetNextInsert();
-    // The object is selected now, and nothing can be typed into it.
+    // The object is now selected as a whole, so nothing can be typed into it.
     if (wasEdited)
         m_listener.keyboardWanted(false);
 }
@@ -358,7 +358,7 @@ void TextStyleEditor::changePartStyleWhenHasSelection(const TText& source, int i
     if (undoFlag == PreviewedChange)
         m_styles.markPreviewStart();
     else
-        cancelPreview(); // the step of undo leads from before the preview to this change
+        cancelPreview(); // the undo step starts at the state before the preview
     m_undoFlag = undoFlag;
     const QTextCursor cursor = m_surface.selection();
     const Guard guard(*this);
@@ -450,7 +450,7 @@ void TextStyleEditor::reportMovedObject()
     m_styles.refreshUndoBaseline();
 }
 
-// What the panel shows
+// Reports to the panel
 
 void TextStyleEditor::reportStyle(const TextStyle& style)
 {

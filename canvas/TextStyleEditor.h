@@ -8,9 +8,9 @@
 
 class QTextCursor;
 
-// Keeps the Qt document of a text object and its style record in step: typing goes from the document into the
-// record, style changes and loading from the record into the document. Also forms the undo steps of typing.
-// GUI thread only.
+// Keeps the Qt document of a text object and its style record synchronised: typing is copied from the
+// document into the record, style changes and loaded records from the record into the document. Also forms
+// the undo steps of typing. GUI thread only.
 class TextStyleEditor
 {
 public:
@@ -19,45 +19,45 @@ public:
     void initShowText();
     void resetDocument(const TText& record, int cursorPosition);
 
-    // The document reports a change that was not made here.
+    // Call when the document reports a change; changes made by this class are ignored.
     void documentChanged(int position, int removed, int added);
 
     void changeAllStyleWhenSelectionMode(const TText& source, int id, bool overall, int undoFlag);
     void changeAllStyleWhenHasSelection(const TText& source, int id);
     void changePartStyleWhenHasSelection(const TText& source, int id, int undoFlag);
     void saveStyleForNextInsert(const TText& style, int undoFlag, int id);
-    // Every character looks as it did before the first preview; does nothing without one.
+    // Restores every character's style from before the first preview; does nothing without one.
     void cancelPreview();
     void setFontFamilyEnsureMode(int mode);
 
-    // Reports the style at the cursor or of the selection.
+    // Reports the style at the cursor or of the selection to the listener.
     void showCurrentTextStyle();
-    // The same for the whole text, leaving no selection.
+    // Reports the style of the whole text and clears the selection.
     void showStyleOfWholeText();
     void selectWholeText();
     void clearSelection();
-    // Reports the object's style with its place, which becomes the state that undo returns to.
+    // Reports the object's style and place and makes them the state that undo returns to.
     void reportMovedObject();
-    // Offset (0,0) switches the shadow off.
+    // Applies the shadow of the record; an offset of (0,0) switches it off.
     void applyShadow();
 
-    // Typing up to now becomes an undo step.
+    // Turns the typing since the last step into an undo step.
     void pushLastEditTextIntoStack();
-    // Its timeout has to call undoTimeOut().
+    // Returns the timer that ends a burst of typing. Connect its timeout to undoTimeOut().
     const QTimer& undoTimer() const { return m_undoTimer; }
     void undoTimeOut();
-    // Whether there is typing that is not part of an undo step yet.
+    // Returns whether there is typing that is not part of an undo step yet.
     bool isTyping() const { return m_undoTimer.isActive(); }
-    // Forgets typing that has not become a step: the object is about to be hidden.
+    // Drops the typing that is not part of an undo step yet, since the object is about to be hidden.
     void discardBurst() { m_undoTimer.stop(); }
 
 private:
     class Guard;
 
-    // Substitutes a missing family and reports it.
+    // Replaces a missing family and reports it.
     void ensureFamily(TextStyle& style);
     int cutOffCharsBeyondMaxNum(int position, int added);
-    // Leaves out of a reported change the characters that did not change.
+    // Narrows a reported change down to the characters that did change.
     void trimUnchanged(int& position, int& removed, int& added) const;
     void replaceCharacters(int position, int removed, int added);
     void charsAddedChange(int position, int added);
@@ -65,7 +65,7 @@ private:
     void styleNewCharacter(int position, bool startOfLine, QChar character, TextStyle& style);
     bool startsFilledLine(int position, int added) const;
     void reconcile();
-    // Brings the texts of the styles there up to date: a change may have parted or joined a pair.
+    // Updates the texts of the styles in the range: a change may have split or joined a surrogate pair.
     void repairTexts(int begin, int end);
     void startBurst();
     void changeSelectionProperty(int id, const TText& source, int from, int to);

@@ -23,7 +23,7 @@ using Gesture = TouchState::Gesture;
 namespace
 {
 
-// Around the picture of a handle that still counts as the handle.
+// Pixels around the picture of a handle that still count as the handle.
 constexpr double HandleTolerance = 8.0;
 constexpr double CaretShift = 1.0;
 
@@ -105,7 +105,7 @@ TouchTextEditor::HandleHit TouchTextEditor::changePaintStateWhenHandleIsPressed(
     if (handleIsHit(m_state.previous, point)) {
         const int wanted = m_state.current.position;
         putCursor(wanted);
-        // The pressed handle is always the current one.
+        // The pressed handle has to be the current one.
         if (m_surface.selection().position() == wanted)
             exchangeValueofCurrentAndPreviousCursor();
         return PreviousHandle;
@@ -124,7 +124,7 @@ void TouchTextEditor::exchangeValueofCurrentAndPreviousCursor()
 
 void TouchTextEditor::moveUpEventPosWhenHasHandleCaret(QGraphicsSceneMouseEvent* event) const
 {
-    // The caret runs above the finger, where it can be seen.
+    // The caret is placed above the finger, where it can be seen.
     if (m_state.handleCaret || m_state.isHandleHeld())
         event->setPos(event->pos() - QPointF(0.0, HANDLEPIXMAPHEIGHT));
 }
@@ -151,7 +151,7 @@ void TouchTextEditor::putCursor(int position)
 int TouchTextEditor::clampedPosition(int position) const
 {
     position = std::clamp(position, 0, m_document.characterCount() - 1);
-    // Nothing can be typed into the middle of a character; services count characters in their own ways.
+    // A caret inside a surrogate pair would split the character. Services count characters in different ways.
     const bool insidePair = position > 0 && m_document.characterAt(position).isLowSurrogate() &&
                             m_document.characterAt(position - 1).isHighSurrogate();
     return insidePair ? position - 1 : position;
@@ -169,7 +169,7 @@ void TouchTextEditor::mouseMove(QGraphicsSceneMouseEvent* event)
     case Gesture::DoubleTap:
         break;
     case Gesture::MoveObject:
-        if (isSelected) // else the selection ended under the finger
+        if (isSelected) // otherwise the selection ended while the finger was down
             dragObject(event);
         break;
     default:
@@ -196,7 +196,7 @@ void TouchTextEditor::dragSelection(QGraphicsSceneMouseEvent* event)
         synchronizeKeyBoardCursorPos();
         return;
     }
-    // What is selected from now on begins at the fixed end.
+    // The new selection starts at the fixed end.
     m_state.gesture = m_state.isHandleHeld() ? Gesture::HandleDrag : Gesture::Select;
     putCursor(m_state.previous.position);
 }
@@ -271,7 +271,7 @@ bool TouchTextEditor::filterDrag(const QGraphicsSceneMouseEvent& event)
     const TextPlacement::Side side = m_placement.itemIsOutOfRange(proposed);
     if (side == TextPlacement::Inside)
         return false;
-    // A drag against the limit is a drag all the same.
+    // A drag that is stopped by the limit still counts as a drag.
     if (m_state.gesture != Gesture::DoubleTap)
         m_state.gesture = Gesture::MoveObject;
     m_state.lastDragPoint = m_placement.adjustItemPos(side);
@@ -300,8 +300,8 @@ void TouchTextEditor::mouseRelease(QGraphicsSceneMouseEvent* event)
     m_surface.repaint();
 }
 
-// For a release on a widget Qt asks for the keyboard by itself, before caret and selection are where they
-// belong.
+// Hides the widget from Qt, which would otherwise request the keyboard on the release, before caret and
+// selection are updated.
 void TouchTextEditor::passReleaseToDocument(QGraphicsSceneMouseEvent* event)
 {
     QWidget* const widget = event->widget();
@@ -313,7 +313,8 @@ void TouchTextEditor::passReleaseToDocument(QGraphicsSceneMouseEvent* event)
 void TouchTextEditor::cancelTouch()
 {
     m_longPressTimer.stop();
-    // The text control and the item's dragging end as with a release; no touch of this class's does.
+    // Sends a release, which ends the gesture of Qt's text control and the dragging of the item, without the
+    // effects that a release has in this class.
     QGraphicsSceneMouseEvent release(QEvent::GraphicsSceneMouseRelease);
     release.setButton(Qt::LeftButton);
     release.setPos(m_state.pressPoint);
@@ -394,7 +395,7 @@ void TouchTextEditor::getPressedPos(QPointF point)
     QTextLine line = measured.layout()->lineAt(0);
     for (int i = 1; !below && i < measured.layout()->lineCount() && line.y() + line.height() < inside; ++i)
         line = measured.layout()->lineAt(i);
-    // What lies left of the line is taken off by the line itself.
+    // xToCursor() subtracts the left offset of the line itself.
     putCursor(tapped.position() + line.xToCursor(point.x() - m_document.documentMargin() - CaretShift));
 }
 
@@ -431,7 +432,7 @@ void TouchTextEditor::showOrHideHandleCaretAccordingCurPos()
     keepOneCharacterSelected();
 }
 
-// While handles show, at least one character stays selected.
+// Keeps at least one character selected while handles are shown.
 void TouchTextEditor::keepOneCharacterSelected()
 {
     QTextCursor cursor = m_surface.selection();
@@ -472,7 +473,8 @@ void TouchTextEditor::mouseDoubleClick(QGraphicsSceneMouseEvent* event)
     m_state.keyboardAsked = false;
     m_surface.setWritable(true);
     m_surface.handleByTextItem(QEvent::GraphicsSceneMouseDoubleClick, *event);
-    m_state.gesture = Gesture::DoubleTap; // after Qt, which may have made a press of it
+    // Set after Qt has handled the event, which may have called the press.
+    m_state.gesture = Gesture::DoubleTap;
     m_styleEditor.selectWholeText();
     m_state.doubleClickedSelection = true;
     m_surface.setWritable(true);
@@ -501,7 +503,7 @@ int TouchTextEditor::getSelectionModel(const QTextCursor& word, int position)
 
 void TouchTextEditor::longPressed()
 {
-    // Editing may have ended under the finger.
+    // Editing may have ended while the finger was down.
     if (m_surface.getFocusFlag() != FocusEdit)
         return;
     m_state.gesture = Gesture::LongPress;
@@ -595,7 +597,7 @@ void TouchTextEditor::getSelectionInfo(int begin, int end, int current, int mode
     case 1:
         m_state.handleCaret = true;
         if (m_state.gesture == Gesture::Press || m_state.gesture == Gesture::LongPress)
-            m_state.gesture = Gesture::None; // the finger holds no end of this selection
+            m_state.gesture = Gesture::None; // the finger is not on an end of this selection
         selectionFromBeginToEnd(begin, end);
         shadowAndAlign = wholeTextSelected() && m_surface.getFocusFlag() == FocusEdit;
         break;

@@ -13,13 +13,13 @@ class QPainter;
 class QTextCursor;
 class TextStyleEditor;
 
-// What a finger and the soft keyboard do to a text object: the first tap selects it, a second edits it, a
-// drag moves it within limits, handles and long press select characters. What the finger does is one
-// TouchState::Gesture, which press, move and release decide in turn. GUI thread only.
+// Handles the finger and the soft keyboard for a text object: the first tap selects the object, a second one
+// starts editing, a drag moves it within limits, handles and long press select characters. The state of the
+// finger is one TouchState::Gesture, which press, move and release change in turn. GUI thread only.
 class TouchTextEditor
 {
 public:
-    // The style editor is that of the same object.
+    // The style editor belongs to the same object.
     TouchTextEditor(const TextObjectParts& parts, TextStyleEditor& styleEditor);
 
     bool isHandleCaret() const { return m_state.handleCaret; }
@@ -30,13 +30,13 @@ public:
     void mouseMove(QGraphicsSceneMouseEvent* event);
     void mouseRelease(QGraphicsSceneMouseEvent* event);
     void mouseDoubleClick(QGraphicsSceneMouseEvent* event);
-    // The press ends without a release.
+    // Ends the current press without a release.
     void cancelTouch();
     void keyPress(QKeyEvent* event);
-    // Its timeout has to call longPressed().
+    // Returns the timer of the long press. Connect its timeout to longPressed().
     const QTimer& longPressTimer() const { return m_longPressTimer; }
     void longPressed();
-    // True swallows the event.
+    // Returns whether the event is handled and has to be swallowed.
     bool filter(QEvent* event);
 
     void getSelectionInfo(int begin, int end, int current, int mode);
@@ -47,7 +47,7 @@ public:
     void paintAboveGlyphs(QPainter* painter) { m_caretPainter.paintCaretAndHandles(painter); }
 
 private:
-    // Which handle a press hit.
+    // The handle that a press hit.
     enum HandleHit { NoHandle = -1, CurrentHandle = 0, PreviousHandle = 1 };
 
     HandleHit changePaintStateWhenHandleIsPressed(QPointF point);
@@ -60,7 +60,7 @@ private:
     void synchronizeKeyBoardCursorPos();
     void makeMouseMoveYPosInsideTextObject(QGraphicsSceneMouseEvent* event) const;
     bool filterDrag(const QGraphicsSceneMouseEvent& event);
-    // Returns whether the object is edited from now on, so that the tap places the cursor.
+    // Returns whether editing of the object starts with this tap, so that it places the cursor.
     bool setBoundingRectLineStatus(TouchState::Gesture ended);
     void enterEditMode();
     void savePostionMoveUndoCommandWhenPositionChanged();

@@ -1,5 +1,5 @@
-// Changes sequences of calls as such: calls are doubled, dropped, moved and sent to other objects and
-// methods, and get payloads that are packed as the program packs them, or nearly.
+// Mutates sequences of calls: calls are duplicated, removed, moved and sent to other objects and methods, and
+// get payloads that are packed as the program packs them, or nearly.
 #include "FrameScript.h"
 
 #include <random>
@@ -48,8 +48,8 @@ public:
 private:
     std::size_t below(std::size_t bound) { return bound == 0 ? 0 : mRandom() % bound; }
 
-    // One packed value at some place, mostly the end: a small number, a number of a certain width, or a
-    // string.
+    // Writes one packed value at a random place, mostly at the end: a small number, a number of a certain
+    // width, or a string.
     void changePayload(std::vector<std::uint8_t>& payload)
     {
         std::vector<std::uint8_t> value;

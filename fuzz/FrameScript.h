@@ -1,9 +1,3 @@
-// Frames written down in few bytes, so that what is tried are calls and not padding. A script is a sequence
-// of
-//
-//   receiver, object, method, flags: a byte each; length of the payload: two bytes; the payload
-//
-// and becomes one frame of the wire for each.
 #pragma once
 
 #include "ServiceChain.h"
@@ -14,13 +8,18 @@
 #include <string>
 #include <vector>
 
+// A compact form of frames, so that the fuzzer changes calls and not padding. A script is a sequence of
+//
+//   receiver, object, method, flags: one byte each; length of the payload: two bytes; the payload
+//
+// each of which becomes one frame of the wire.
 struct FrameCall {
     enum Flag : std::uint8_t {
-        CALLBACK = 1,  // for the callback adapters
-        REMOTE = 2,    // the call crosses a process border
+        CALLBACK = 1,  // for a callback adapter
+        REMOTE = 2,    // the call comes from another process
         LIES = 4,      // the size in the header is not that of the payload
-        CUT = 8,       // the frame ends behind the payload
-        NEGATIVE = 16, // with LIES: below zero
+        CUT = 8,       // the frame ends after the payload
+        NEGATIVE = 16, // with LIES: the size is negative
     };
 
     std::uint8_t receiver = 0;
@@ -31,7 +30,7 @@ struct FrameCall {
 
     static constexpr std::size_t HEAD = 6;
 
-    // Leaves out what is cut off at the end.
+    // Reads all complete calls; the payload of the last one may be cut off.
     static std::vector<FrameCall> read(const std::uint8_t* data, std::size_t size)
     {
         std::vector<FrameCall> calls;

@@ -1,5 +1,3 @@
-// The data path of a fuzz target: a folder in memory that goes with the process, and the environment that
-// names it.
 #pragma once
 
 #include <cstdint>
@@ -11,17 +9,19 @@
 #include <sys/stat.h>
 #include <unistd.h>
 
+// The data path of a fuzz target: a folder in memory that is removed when the process ends, and the
+// environment variables that point to it.
 class FuzzFolder
 {
 public:
-    // The one of this process.
+    // Returns the folder of this process.
     static FuzzFolder& instance()
     {
         static FuzzFolder folder;
         return folder;
     }
 
-    // The folder that the paths of the path file are relative to, without a final slash.
+    // Returns the folder that the paths in the path file are relative to, without a slash at its end.
     std::string base() const { return mRoot + "/defaultuser"; }
 
     static void write(const std::string& path, std::string_view bytes)
@@ -41,7 +41,7 @@ public:
         return {std::istreambuf_iterator<char>(file), {}};
     }
 
-    // Removes all that lies in the folder.
+    // Removes the contents of the folder.
     static void empty(const std::string& folder)
     {
         std::error_code error;

@@ -1,5 +1,5 @@
-// Runs a fuzz target over files: each argument is a file, or a folder of which all files are taken. Ends 1
-// when there was none; what the target or a sanitizer finds ends the process.
+// Runs a fuzz target on files: each argument is a file, or a folder whose files are all used. The exit code
+// is 1 when there are no files; a problem found by the target or a sanitizer ends the process.
 #include <algorithm>
 #include <cstdint>
 #include <cstdio>
@@ -36,7 +36,7 @@ void run(const fs::path& path)
     std::printf("%s\n", path.c_str());
     std::fflush(stdout);
     std::ifstream file(path, std::ios::binary);
-    // Exactly as long as the file: a sanitizer sees what goes beyond.
+    // Exactly as long as the file, so that a sanitizer detects reads beyond the end.
     const std::vector<char> bytes{std::istreambuf_iterator<char>(file), {}};
     LLVMFuzzerTestOneInput(reinterpret_cast<const std::uint8_t*>(bytes.data()), bytes.size());
 }

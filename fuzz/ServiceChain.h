@@ -1,5 +1,3 @@
-// The way of a call from a socket into the program: the reader of a connection, the receiver that posts
-// events, the adapters of all services, and somebody who takes the calls. All in the calling thread.
 #pragma once
 
 #include "ServiceSink.h"
@@ -19,11 +17,14 @@
 #include <sys/socket.h>
 #include <unistd.h>
 
+// The path of a call from a socket into the program: the reader of a connection, the receiver that posts
+// events, the adapters of all services, and an object that accepts the calls. Everything runs in the calling
+// thread.
 class ServiceChain : private PTC::IProxyFactory
 {
 public:
     static constexpr long RECEIVER = 4;
-    static constexpr int CALLBACK_ADAPTERS = 14; // their objects are 0 to 13
+    static constexpr int CALLBACK_ADAPTERS = 14; // their object ids are 0 to 13
     static constexpr std::size_t MOST_BYTES = 8 * static_cast<std::size_t>(SocketFrame::FRAME_SIZE);
 
     ServiceChain()
@@ -38,7 +39,7 @@ public:
         mRemote.addReceiver(receiver.release());
     }
 
-    // What a peer sends before it hangs up, cut at MOST_BYTES.
+    // Handles the bytes that a peer sends before it disconnects, MOST_BYTES at most.
     void receive(std::string_view bytes)
     {
         int ends[2];
@@ -97,7 +98,7 @@ private:
         addNotify<SystemSetupManagerRemoteProxy, ISystemSetupManagerNotify>();
     }
 
-    // A proxy without a sender: what it is told goes nowhere.
+    // Creates a proxy without a sender: calls of it have no effect.
     PTC::IProxyBase* createProxy(long type, long id, long client) override
     {
         const bool isKnown = type == TitlerAdapter::CALLBACK_INTERFACE_ID && client != 0;
@@ -106,11 +107,11 @@ private:
 
     ServiceSink mSink;
     SocketRemoteReceiver mRemote{0};
-    PTC::QtReceiver* mReceiver = nullptr; // the remote receiver's
+    PTC::QtReceiver* mReceiver = nullptr; // owned by mRemote
     long mNextId = 0;
 };
 
-// Posted events need an application.
+// Returns the chain of the process, with an application, which posted events need.
 inline ServiceChain& serviceChain()
 {
     static int count = 1;

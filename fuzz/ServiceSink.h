@@ -1,5 +1,3 @@
-// The client of all services, in whose place anything may be told: it looks at every string and keeps
-// nothing.
 #pragma once
 
 #include "messaging/services/IAPPEventFilter.h"
@@ -16,6 +14,7 @@
 #include <numeric>
 #include <string>
 
+// Accepts the calls of all services: reads every string and keeps nothing.
 class ServiceSink : public ITitler,
                     public IAPPEventFilterCallBack,
                     public IAPPEventFilterNotify,

@@ -1,5 +1,5 @@
-// Changes XML as XML: elements are doubled, taken away, moved and nested, attributes are exchanged and get
-// the values that have meant trouble elsewhere. What does not read as XML is changed byte by byte.
+// Mutates XML: elements are duplicated, removed, moved and nested, attributes are exchanged and set to values
+// that are often handled wrongly. Input that is not XML is mutated byte by byte.
 #include <algorithm>
 #include <cstdint>
 #include <cstring>
@@ -23,9 +23,9 @@ struct Element {
 };
 using ElementPointer = std::unique_ptr<Element>;
 
-constexpr int DEEPEST = 80; // a little more than the program takes
+constexpr int DEEPEST = 80; // slightly deeper than the program accepts
 
-// Only what the files of the program are made of: elements, attributes, text.
+// Reads only what the files of the program contain: elements, attributes, text.
 class Reader
 {
 public:
@@ -274,7 +274,7 @@ private:
         if (parent.children.empty())
             return;
         const std::size_t from = below(parent.children.size());
-        // Once in a while very often: there are limits to be met.
+        // One time in eight adds a hundred copies, to reach the limits.
         const std::size_t times = below(8) == 0 ? 100 : 1;
         for (std::size_t i = 0; i < times; ++i)
             parent.children.push_back(copyOf(*parent.children[from]));
@@ -320,7 +320,7 @@ private:
         if (below(3) == 0)
             element.attributes.erase(element.attributes.begin() + std::ptrdiff_t(at));
         else if (below(2) == 0)
-            element.attributes.push_back(element.attributes[at]); // twice the same is not XML
+            element.attributes.push_back(element.attributes[at]); // an attribute given twice is not XML
         else
             element.attributes[at].first += 'x';
     }
@@ -331,7 +331,7 @@ private:
             return;
         std::string& value = element.attributes[below(element.attributes.size())].second;
         if (below(4) == 0)
-            value += value; // long texts grow
+            value += value; // doubles the text, to get long ones
         else if (below(3) == 0)
             value += VALUES[below(std::size(VALUES))];
         else

@@ -1,4 +1,4 @@
-// Sequences of calls against everything between a socket and the program.
+// Sends sequences of calls through all parts between a socket and the program.
 #include "FrameScript.h"
 
 extern "C" int LLVMFuzzerTestOneInput(const std::uint8_t* data, std::size_t size)

@@ -1,5 +1,5 @@
-// An order file of any bytes, in a folder with titles: it is read, its titles are listed, and it can be
-// written again with the same rows.
+// Reads an order file of random bytes in a folder with titles, lists the titles, and checks that the file can
+// be written again with the same rows.
 #include "FuzzFolder.h"
 #include "document/Archive.h"
 #include "document/ArchiveController.h"
@@ -55,7 +55,7 @@ extern "C" int LLVMFuzzerTestOneInput(const std::uint8_t* data, std::size_t size
         for (Archive* archive : TitleParser().getFilsByOrderInFolder(folder))
             delete archive;
     } catch (const std::out_of_range&) {
-        // the documented answer to a name that no title file can have
+        // the documented result for a name that cannot be that of a title file
     }
     ArchiveController controller;
     const QString name = QString::fromStdString(folder);

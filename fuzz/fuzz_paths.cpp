@@ -1,4 +1,4 @@
-// A path file of any bytes.
+// Reads a path file of random bytes.
 #include "FuzzFolder.h"
 #include "support/FolderLookup.h"
 #include "support/IPathManagerEx.h"
@@ -7,7 +7,8 @@
 extern "C" int LLVMFuzzerTestOneInput(const std::uint8_t* data, std::size_t size)
 {
     const std::string_view bytes = FuzzFolder::view(data, size);
-    // The folders that it names are made: none outside the fuzz folder, however the dots are written.
+    // Skips input with dots in any notation: the program creates the folders named in the file, and none may
+    // be outside the fuzz folder.
     if (bytes.find("..") != std::string_view::npos || bytes.find("&#") != std::string_view::npos)
         return 0;
     const std::string base = FuzzFolder::instance().base();
@@ -21,7 +22,7 @@ extern "C" int LLVMFuzzerTestOneInput(const std::uint8_t* data, std::size_t size
           &IPathManagerEx::getTitleResourcesPath, &IPathManagerEx::getTitlerTemplatesPath,
           &IPathManagerEx::getTitlerPath}) {
         const std::wstring path = FolderLookup::wide(getter);
-        if (path != FolderLookup::wide(getter)) // the second is remembered
+        if (path != FolderLookup::wide(getter)) // the second call returns the stored path
             std::abort();
     }
     return 0;

@@ -1,5 +1,5 @@
-// A picture file of any bytes, under the name that its first byte chooses: it is measured and reduced as a
-// picture that an operator brings in. The limits on memory that the fuzzer runs with are part of the test.
+// Measures and scales down a picture file of random bytes, like a picture that the operator imports. The
+// first byte selects its name. The fuzzer's memory limits are part of the test.
 #include "FuzzFolder.h"
 #include "document/ImageResizer.h"
 #include "document/PictureReader.h"
@@ -41,7 +41,7 @@ extern "C" int LLVMFuzzerTestOneInput(const std::uint8_t* data, std::size_t size
     const PictureReader reader(QString::fromStdString(path));
     const QImage picture = reader.read();
     if (!picture.isNull() && picture.size() != reader.size())
-        std::abort(); // what was checked is not what was decoded
+        std::abort(); // the decoded size is not the one that was checked
     reader.read(QSize(240, 135));
     ImageResizer resizer;
     if (resizer.isAvailableImage(source)) {

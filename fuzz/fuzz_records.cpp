@@ -1,5 +1,5 @@
-// The records of the wire, of any bytes: nothing behind the end of the message is looked at, and what was
-// read packs to a message that reads the same. The first byte chooses the record.
+// Reads the records of the wire from random bytes: checks that nothing is read beyond the end of the message,
+// and that a record can be packed and read again unchanged. The first byte selects the record.
 #include "messaging/services/RecordPacking.h"
 #include "messaging/services/TitlerParams.h"
 
@@ -14,7 +14,7 @@
 namespace
 {
 
-// Heap memory of exactly that size, in which the sanitizer sees every byte too far.
+// Heap memory of exactly this size, so that the sanitizer detects every byte read beyond it.
 using Message = std::vector<unsigned char>;
 
 template <typename Record>

@@ -1,5 +1,5 @@
-// The remembered text style and the remembered paths, of any bytes. What was read can be saved and reads the
-// same.
+// Reads the stored text style and the stored paths from random bytes. Checks that what was read can be saved
+// and read again unchanged.
 #include "FuzzFolder.h"
 #include "document/FontStyle.h"
 #include "document/LastSettingParser.h"

@@ -1,5 +1,5 @@
-// What a connection may bring. The input is a number of pieces, each a byte, two bytes of length and the
-// bytes; an odd first byte fills the stream with zeros up to the end of the frame.
+// Sends random bytes over a connection. The input is a sequence of pieces, each one byte, two bytes of length
+// and the bytes; an odd first byte fills the frame up with zeros.
 #include "ServiceChain.h"
 
 #include <algorithm>

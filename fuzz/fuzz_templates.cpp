@@ -1,5 +1,5 @@
-// The template folders, with files of any bytes in them. The input is a number of files, each a byte that
-// names it, two bytes of length and the bytes.
+// Reads the template folders with files of random bytes. The input is a sequence of files, each one byte that
+// selects its name, two bytes of length and the bytes.
 #include "FuzzFolder.h"
 #include "document/Archive.h"
 #include "document/ArchiveController.h"

@@ -1,4 +1,5 @@
-// A title file of any bytes. One that can be read can be written, and then reads and writes the same.
+// Reads a title file of random bytes. Checks that a readable one can be written, and then read and written
+// again unchanged.
 #include "FuzzFolder.h"
 #include "document/Archive.h"
 #include "document/TitleParser.h"
@@ -8,7 +9,7 @@
 namespace
 {
 
-// The bytes that the title file at path has after it was read and saved under the name again.
+// Reads the title file at path, saves it under the name again and returns the bytes of the new file.
 bool saveAgain(const std::string& path, const std::string& again, std::string& bytes)
 {
     Archive archive;
@@ -31,7 +32,7 @@ extern "C" int LLVMFuzzerTestOneInput(const std::uint8_t* data, std::size_t size
     std::string second;
     if (!saveAgain(folder + "/a.xml", folder + "/b.xml", first))
         return 0;
-    // What this program writes it can read, and nothing of it changes.
+    // The program must be able to read what it writes, without any change.
     if (!saveAgain(folder + "/b.xml", folder + "/c.xml", second)) {
         std::fprintf(stderr, "cannot be read again:\n%s\n", first.c_str());
         std::abort();

@@ -1,4 +1,4 @@
-// What is pressed: buttons, sliders, radio buttons.
+// Pages of buttons, sliders and radio buttons.
 #include "gallery/GalleryPages.h"
 
 #include "touchui/KSPushbutton.h"
@@ -13,7 +13,7 @@ namespace
 
 const QSize PAGE(960, 640);
 
-// The image string of a family: folder, and its names for the plain and the selected rows.
+// Returns the image string of a family from its folder and the names of its plain and its selected pictures.
 QString buttonImages(const QString& folder, const QString& rest, const QString& selected)
 {
     QString images = folder;
@@ -27,7 +27,7 @@ QString buttonImages(const QString& folder, const QString& rest, const QString& 
     return images;
 }
 
-// A button that shows when it is pressed.
+// Makes a button that shows when it is pressed.
 KSPushbutton* liveButton(const QString& images, const QString& text, QWidget* parent)
 {
     auto* button = new KSPushbutton(images, text, parent);
@@ -89,7 +89,7 @@ GalleryPage GalleryPages::pushButtons()
         page.caption(QPoint(20, y - 12), QLatin1String(family.caption));
         y += 24;
     }
-    // With an icon, a text at the left, a narrow and a wide one.
+    // Buttons with an icon and with left-aligned text, a narrow and a wide one.
     auto* icon = new KSPushbutton(families[0].images, page.window.get());
     icon->setIcon(QIcon(QStringLiteral(":/TextToolPanel_Buttons/Icon_SizeUp")));
     icon->setIconSize(QSize(48, 48));

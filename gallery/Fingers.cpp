@@ -86,11 +86,12 @@ void Fingers::cancel()
     m_time += STEP;
     QWindowSystemInterface::handleTouchCancelEvent<QWindowSystemInterface::SynchronousDelivery>(
         window, m_time, m_devices.back().get(), Qt::NoModifier);
-    // Qt keeps the targets of fingers that were taken away, and would find them again for later ones.
+    // With a new device later fingers do not reach the targets that Qt still remembers for the cancelled
+    // ones.
     plugIn();
 }
 
-// One event tells of all fingers, of which one has changed.
+// Sends one event with all fingers, of which the given one has changed.
 void Fingers::send(int finger, QEventPoint::State state)
 {
     QList<QWindowSystemInterface::TouchPoint> points;

@@ -13,8 +13,9 @@
 class QPointingDevice;
 class QWidget;
 
-// A touch screen without a screen: fingers that press, move, lift or are taken away, through the window
-// system like real ones. Several may be down at once, also on several windows. GUI thread only.
+// Simulates a touch screen: fingers that press, move, lift or are cancelled. Events are sent through the
+// window system like those of a real screen. Several fingers may be down at once, also on different windows.
+// GUI thread only.
 class Fingers
 {
 public:
@@ -23,13 +24,13 @@ public:
     Fingers(const Fingers&) = delete;
     Fingers& operator=(const Fingers&) = delete;
 
-    // A finger that is down already is moved instead. Positions are global.
+    // Presses with a finger; one that is down already is moved instead. Global coordinates.
     void press(int finger, QWidget* window, const QPoint& position);
-    // In the widget's coordinates.
+    // Presses at a position in coordinates of the widget.
     void pressWidget(int finger, QWidget* widget, const QPoint& position);
     void move(int finger, const QPoint& position);
     void lift(int finger);
-    // Takes all fingers away without lifting them, as a window system does for a gesture of its own.
+    // Cancels all fingers without a release, as a window system does when it recognises a gesture.
     void cancel();
     void liftAll();
 
@@ -39,7 +40,7 @@ public:
 
 private:
     struct Finger {
-        int id = 0; // a new one for each press, as touch screens give
+        int id = 0; // new for each press, as on real touch screens
         QPoint position;
         QPointer<QWindow> window;
     };
@@ -47,7 +48,7 @@ private:
     void plugIn();
     void send(int finger, QEventPoint::State state);
 
-    // The last one is in use. Earlier ones stay: events and widgets may know them.
+    // The last device is in use. Earlier ones are kept, since events and widgets may still refer to them.
     std::vector<std::unique_ptr<QPointingDevice>> m_devices;
     QMap<int, Finger> m_down;
     int m_nextId = 1;

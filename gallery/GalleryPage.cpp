@@ -32,7 +32,8 @@ void GalleryPage::show()
 
 QImage GalleryPage::shoot()
 {
-    APPEventFilter::release(); // a pose has several fingers, on several widgets
+    // A pose has several fingers, on several widgets, which the filter would refuse.
+    APPEventFilter::release();
     Fingers fingers;
     show();
     QCoreApplication::processEvents();

@@ -17,19 +17,20 @@ struct GalleryPage {
     GalleryPage() = default;
     GalleryPage(const QString& pageName, const QSize& size);
 
-    // Shows the window at the screen's corner and makes it the one that bounds menus, balloons and lifted
-    // items.
+    // Shows the window in the corner of the screen and makes it the one that limits menus, balloons and
+    // lifted items.
     void show();
-    // The page in its pose, with what it has opened; the fingers are taken away again.
+    // Returns a picture of the page in its pose, with the windows that it has opened. Cancels the fingers
+    // afterwards.
     QImage shoot();
-    // Brings the window down and closes what it opened.
+    // Closes the window and the windows that it has opened.
     void close();
 
-    // A caption in the page.
+    // Adds a caption to the page.
     QLabel* caption(const QPoint& position, const QString& text) const;
 
-    QString name; // a file name without a suffix
+    QString name; // usable as a file name without suffix
     std::unique_ptr<QWidget> window;
-    // Brings the shown page into the states that need a finger or an open window.
+    // Brings the page, when it is shown, into states that need a finger or an open window.
     std::function<void(Fingers&)> pose = [](Fingers&) {};
 };

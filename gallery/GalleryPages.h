@@ -6,7 +6,7 @@
 
 #include <functional>
 
-// All pages of the gallery, each made when it is needed. The resources must have been initialised.
+// Functions that make the pages of the gallery. The resources must be initialised first.
 namespace GalleryPages
 {
 
@@ -14,7 +14,7 @@ using Maker = std::function<GalleryPage()>;
 
 QList<Maker> all();
 
-// The makers by theme.
+// One function per page.
 GalleryPage pushButtons();
 GalleryPage slidersAndRadioButtons();
 GalleryPage comboBoxes();

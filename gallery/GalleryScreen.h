@@ -2,8 +2,9 @@
 
 #include <QTemporaryFile>
 
-// A screen of 1920x1080 without a display, the same on every machine: for pictures and games. To be made
-// before the application, and to be kept as long. GALLERY_PLATFORM in the environment names another platform.
+// Sets up a screen of 1920x1080 without a display, identical on every machine, for pictures and random tests.
+// Make it before the application and keep it as long as that. The environment variable GALLERY_PLATFORM
+// selects another platform.
 class GalleryScreen
 {
 public:

@@ -1,4 +1,4 @@
-// What scrolls: bars, the list of items, the tree.
+// Pages of scroll bars, the list of items and the tree.
 #include "gallery/GalleryPages.h"
 
 #include "gallery/SampleTree.h"
@@ -18,7 +18,7 @@ const QSize PAGE(960, 640);
 constexpr int ITEM_WIDTH = 320;
 constexpr int ITEM_HEIGHT = 90;
 
-// An item with a name.
+// A list item that shows its name.
 class NamedItem : public KSBaseItemWidget
 {
 public:
@@ -123,7 +123,7 @@ GalleryPage GalleryPages::liftedItem()
     page.pose = [list](Fingers& fingers) {
         KSBaseItemWidget* item = list->getWidgetItem(1);
         fingers.pressWidget(0, item, item->getDragArea().center());
-        list->slotShowPopupItem(); // the hold is over
+        list->slotShowPopupItem(); // as when the time of the long press has passed
         fingers.move(0, fingers.position(0) + QPoint(0, 150));
     };
     return page;

@@ -21,12 +21,12 @@ namespace
 {
 
 constexpr int MOST_FINGERS = 3;
-constexpr int REACH = 140; // how far a finger goes in one step
+constexpr int REACH = 140; // pixels that a finger moves at most in one step
 constexpr int SMALL_REACH = 8;
 constexpr int WHEEL_STEP = 120;
-constexpr int MARGIN = 30;            // how far beside a window a finger may be
-constexpr qint64 SETTLE_TIME = 15000; // a flick may run that long, in milliseconds
-constexpr int STEPS_PER_REST = 500;   // now and then everything comes to rest
+constexpr int MARGIN = 30;            // pixels that a finger may be outside a window
+constexpr qint64 SETTLE_TIME = 15000; // milliseconds that a flick may run
+constexpr int STEPS_PER_REST = 500;   // all fingers are lifted after this number of steps
 
 template <class Widget>
 QList<Widget*> widgets()
@@ -69,7 +69,7 @@ QStringList Monkey::play(GalleryPage& page, int steps)
         if (i % STEPS_PER_REST == 0 || i == steps) {
             m_fingers.liftAll();
             QCoreApplication::processEvents();
-            // At once: the watchdog must not be what frees it.
+            // Checked at once, before the watchdog can release the lock.
             if (m_filter->isLock(nullptr, LOCKMETHOD_TOUCH)) {
                 return {QStringLiteral("step %1: the touch lock is held by %2").arg(i).arg(holders())};
             }
@@ -105,7 +105,7 @@ void Monkey::step(const GalleryPage& page)
     }
 }
 
-// Those that the page has opened, the last one on top.
+// Returns the windows that the page has opened, the topmost one last.
 QList<QWidget*> Monkey::windows(const GalleryPage& page) const
 {
     QList<QWidget*> result;
@@ -121,17 +121,17 @@ QList<QWidget*> Monkey::windows(const GalleryPage& page) const
     return result;
 }
 
-// Chosen without regard to what the page has come to, so that a seed gives the same input each time.
+// Chooses a position independently of the state of the page, so that a seed always gives the same input.
 QPoint Monkey::anyPoint(const GalleryPage& page)
 {
-    // More often on something than beside everything.
+    // Three of four positions are on a widget.
     const QRect area = number(4) != 0 && !m_targets.isEmpty()
                            ? m_targets.at(number(static_cast<int>(m_targets.size())))
                            : page.window->rect().adjusted(-MARGIN, -MARGIN, MARGIN, MARGIN);
     return page.window->mapToGlobal(area.topLeft() + QPoint(number(area.width()), number(area.height())));
 }
 
-// The window that lies on top there.
+// Returns the topmost window at the place.
 QWidget* Monkey::windowAt(const GalleryPage& page, const QPoint& place) const
 {
     QWidget* window = page.window.get();
@@ -174,7 +174,7 @@ void Monkey::lift()
     m_fingers.lift(finger);
 }
 
-// A click or a drag with the mouse, or its wheel.
+// Clicks or drags with the mouse, or turns its wheel.
 void Monkey::mouse(const GalleryPage& page)
 {
     QPoint place = anyPoint(page);

@@ -12,22 +12,20 @@
 class KSAppEventFilter;
 class QWidget;
 
-// Plays at random with a page: fingers that press, move, lift and are taken away, several at once and on
-// several windows, and the mouse. The same seed plays the same game. The filter is the application's.
+// Sends random input to a page: fingers that press, move, lift and are cancelled, several at once and on
+// several windows, and the mouse. The same seed gives the same input. The filter is that of the application.
 class Monkey
 {
 public:
     Monkey(KSAppEventFilter* filter, quint32 seed);
 
-    // Plays so many steps, lifts everything and waits until nothing moves. What is wrong then, a line each:
-    // a stuck touch lock, a widget that is left pressed, a finger that a list still follows.
-    // Plays so many steps, lifting everything now and then and at the end, and waits until nothing moves.
-    // What is wrong then, a line each: a stuck touch lock, a widget that is left pressed, a list that still
-    // runs.
+    // Carries out the number of steps, lifts all fingers now and then and at the end, and waits until nothing
+    // moves. Returns one line for each problem: a touch lock that is still held, a widget that stays pressed,
+    // a list that keeps moving.
     QStringList play(GalleryPage& page, int steps);
-    // Of all that was played, the same for the same seed, page and number of steps.
+    // Returns a checksum of the input so far, which is the same for the same seed, page and number of steps.
     quint32 inputChecksum() const { return m_input; }
-    // What is not at rest in any widget of the process, a line each.
+    // Returns one line for each widget of the process that is not at rest.
     static QStringList leftovers();
 
 private:
@@ -46,6 +44,6 @@ private:
     KSAppEventFilter* m_filter;
     QRandomGenerator m_random;
     Fingers m_fingers;
-    QList<QRect> m_targets; // the widgets of the page, in its coordinates
+    QList<QRect> m_targets; // rectangles of the page's widgets, in coordinates of the page
     quint32 m_input = 2166136261U;
 };

@@ -13,7 +13,7 @@ namespace
 
 using Grid = QList<QRgb>;
 
-// Empty when the text is no digest.
+// Returns an empty grid when the text is not a digest.
 Grid parse(const QStringList& digest)
 {
     Grid grid;
@@ -81,7 +81,7 @@ QImage PagePicture::shoot(QWidget* window)
             others.append(other);
         }
     }
-    // Qt keeps them in no order of their own.
+    // Sorted, since Qt returns the windows in no fixed order.
     std::sort(others.begin(), others.end(), [](const QWidget* a, const QWidget* b) {
         return std::make_pair(a->y(), a->x()) < std::make_pair(b->y(), b->x());
     });

@@ -6,7 +6,7 @@
 
 class QWidget;
 
-// Pictures of pages, and the digests by which they are compared: a grid of average colours, as text, small
+// Makes pictures of pages, and digests for comparing them: grids of average colours, as text, which are small
 // enough to be kept with the sources.
 namespace PagePicture
 {
@@ -14,21 +14,22 @@ namespace PagePicture
 constexpr int COLUMNS = 64;
 constexpr int ROWS = 36;
 
-// The window with all other windows of this process that show over it, menus and balloons among them.
+// Returns a picture of the window and of all other windows of this process above it, such as menus and
+// balloons.
 QImage shoot(QWidget* window);
 
-// One line a row of the grid, each cell as six hexadecimal digits. The picture may have any size.
+// Returns one line per row of the grid, with six hexadecimal digits per cell. The picture may have any size.
 QStringList digest(const QImage& picture);
 
 struct Difference {
-    bool sameShape = false; // both are whole digests
-    int worst = 0;          // the largest difference of a colour part, 0 to 255
-    int cells = 0;          // cells that differ by more than the tolerance
-    double mean = 0;        // over all colour parts
+    bool sameShape = false; // whether both digests are complete
+    int worst = 0;          // largest difference of a colour component, 0 to 255
+    int cells = 0;          // number of cells that differ by more than the tolerance
+    double mean = 0;        // average difference of all colour components
 };
 
 Difference compare(const QStringList& kept, const QStringList& seen, int tolerance);
-// The cells that differ by more than the tolerance in red over the dimmed picture.
+// Returns the picture, dimmed, with the cells that differ by more than the tolerance marked in red.
 QImage explain(const QImage& picture, const QStringList& kept, int tolerance);
 
 } // namespace PagePicture

@@ -1,4 +1,4 @@
-// What opens beside its owner: lists of combo boxes, menus, balloons.
+// Pages of combo boxes, menus and balloons, which open next to their owner.
 #include "gallery/GalleryPages.h"
 
 #include "touchui/Balloon.h"
@@ -34,7 +34,7 @@ QStringList numbered(const QString& text, int count)
     return rows;
 }
 
-// A button that opens a menu like that of the title list.
+// Makes a button that opens a menu like that of the title list.
 KSMenu* menuAt(const GalleryPage& page, const QPoint& place, const QString& text, int alignment)
 {
     auto* button =
@@ -106,7 +106,7 @@ GalleryPage GalleryPages::menus()
                                   QPoint(1190, 324), QPoint(130, 660), QPoint(710, 684)};
         for (int i = 0; i < menus.size(); ++i) {
             menus.at(i)->popup(window->mapToGlobal(anchors[i]));
-            if (i == 0) { // while it is alone: a press beside the others would close them
+            if (i == 0) { // pressed while it is the only menu: a press would close the others
                 fingers.pressWidget(0, menus.at(0), menus.at(0)->getMenuItemRect(1).center());
             }
         }

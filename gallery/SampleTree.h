@@ -7,7 +7,7 @@
 #include <memory>
 #include <vector>
 
-// Folders of files for the tree of the gallery.
+// The sample folders and files of the gallery's tree.
 class SampleTree : public KSModelDataFactory
 {
     Q_OBJECT
@@ -24,7 +24,7 @@ private:
     struct Node {
         QString name;
         Node* parent = nullptr;
-        int number = 0; // among its siblings
+        int number = 0; // index among its siblings
         std::vector<std::unique_ptr<Node>> children;
     };
 

@@ -1,4 +1,4 @@
-// Larger parts: tabs and the tools bar.
+// Pages of larger parts: tabs and the tools bar.
 #include "gallery/GalleryPages.h"
 
 #include "app/ToolsBar.h"
@@ -66,7 +66,8 @@ GalleryPage GalleryPages::toolsBar()
     empty->resetToDefaultState();
     empty->slotDisableNewTextButton(true);
     page.pose = [full](Fingers& fingers) {
-        // The bar draws its menu through the application's filter, which is not there for a pose.
+        // The bar draws its menu in its event filter. The application's filter, which normally calls it, does
+        // not exist during a pose.
         full->findChild<QMenu*>()->installEventFilter(full);
         full->findChild<KSPushbutton*>(QStringLiteral("SafeArea"))->click();
         fingers.pressWidget(0, full->findChild<KSPushbutton*>(QStringLiteral("Folder")), QPoint(60, 30));

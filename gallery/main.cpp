@@ -1,11 +1,10 @@
-// The gallery of the touch widgets: every widget in every state, one window a page.
+// The gallery of the touch widgets: every widget in every state, one window per page.
 //
 //   gallery                      shows all pages
-//   gallery PAGE...              shows these
-//   gallery --shoot DIR          writes a PNG a page
-//   gallery --digest DIR         writes the digests that pictures are compared with
-//   gallery --monkey SEED COUNT  plays COUNT random steps over all pages; ends 1 when something is left
-//   pressed
+//   gallery PAGE...              shows these pages
+//   gallery --shoot DIR          writes a PNG file per page
+//   gallery --digest DIR         writes the digests for comparing pictures
+//   gallery --monkey SEED COUNT  sends COUNT random inputs to all pages; exit code 1 when a problem is found
 #include "app/APPEventFilter.h"
 #include "gallery/GalleryPages.h"
 #include "gallery/GalleryScreen.h"
@@ -71,7 +70,7 @@ int playMonkey(quint32 seed, int count, const QStringList& names)
     }
     int failures = 0;
     for (qsizetype i = 0; i < pages.size(); ++i) {
-        // Each page has a seed of its own, so that it can be played alone.
+        // Each page has its own seed, so that it can be tested alone.
         GalleryPage page = pages.at(i)();
         const int steps =
             count / static_cast<int>(pages.size()) + (i < count % static_cast<int>(pages.size()) ? 1 : 0);

@@ -1,14 +1,14 @@
-// One entry of the title list's option menu.
 #pragma once
 
 #include <QAction>
 
+// One entry of the title list's option menu.
 class ArchiveAction : public QAction
 {
     Q_OBJECT
 
 public:
-    // No entry has number 4.
+    // The number 4 is not used.
     enum ARCHIVE_ACTION_TYPE {
         ACTION_CREATE = 0,
         ACTION_COPY = 1,

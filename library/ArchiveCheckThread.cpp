@@ -13,7 +13,7 @@
 namespace
 {
 
-constexpr std::size_t SLICE = 250; // titles between two reports
+constexpr std::size_t SLICE = 250; // titles checked between two reports
 
 } // namespace
 

@@ -1,5 +1,3 @@
-// Finds the titles of a long folder that cannot be read, slice by slice, so that the list can leave them out
-// without having waited for all of them. Keeps no records.
 #pragma once
 
 #include <QMutex>
@@ -11,24 +9,26 @@
 
 class FolderTitles;
 
+// Checks the titles of a long folder in slices for those that cannot be read, so that the list can be shown
+// before all are checked. Keeps no records.
 class ArchiveCheckThread : public QThread
 {
     Q_OBJECT
 
 public:
-    // Looks at the rows from the first one on.
+    // Checks the rows starting at first.
     ArchiveCheckThread(std::shared_ptr<const FolderTitles> titles, std::size_t first,
                        QObject* parent = nullptr);
-    // Waits for the title that is being read, not for the others.
+    // Ends the thread after the title that is being read.
     ~ArchiveCheckThread() override;
 
-    // Starts the thread, unless it has been started. GUI thread.
+    // Starts the thread if it is not started yet. GUI thread.
     void begin();
-    // Returns the rows found since the last call. Any thread.
+    // Returns the unreadable rows found since the last call. Any thread.
     QSet<std::size_t> takeUnreadable();
 
 Q_SIGNALS:
-    // There are unreadable titles to be taken. Sent from this thread.
+    // Emitted by this thread when takeUnreadable() has new rows.
     void unreadableFound();
 
 protected:

@@ -26,7 +26,7 @@ void ArchiveInitThread::run()
     AlternateStack::useInThisThread();
     QList<Archive*> archives = mController.getArchiveList(mFolder);
     {
-        // Not held during the announcement, which waits for the GUI thread.
+        // Unlocked before the signal is emitted, which blocks until the GUI thread has handled it.
         QMutexLocker lock(&mMutex);
         const QMetaMethod finished =
             QMetaMethod::fromSignal(&ArchiveInitThread::threadGetArchiveListFinished);

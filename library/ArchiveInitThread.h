@@ -1,4 +1,3 @@
-// Loads the titles of a folder off the GUI thread.
 #pragma once
 
 #include "document/Archive.h"
@@ -10,22 +9,23 @@
 #include <QThread>
 #include <atomic>
 
+// Loads the titles of a folder outside the GUI thread.
 class ArchiveInitThread : public QThread
 {
     Q_OBJECT
 
 public:
     explicit ArchiveInitThread(QString folder, QObject* parent = nullptr);
-    // Waits for the thread; records that nobody took are deleted. Must not run while the receiver of the
-    // signal is kept from taking it, see cancel().
+    // Waits for the thread and deletes records that no receiver has taken. The receiver of the signal must be
+    // able to take it meanwhile, see cancel().
     ~ArchiveInitThread() override;
 
-    // From now on the titles are not announced any more. One announcement may be under way already: the
-    // receiver has to go on handling events until the thread has finished. Any thread.
+    // Stops the announcement of the titles. The signal may be on its way already: the receiver has to go on
+    // handling events until the thread has finished. Any thread.
     void cancel() { mCancelled = true; }
 
 Q_SIGNALS:
-    // The records pass to the receiver. Sent from this thread, to be connected with
+    // Passes the records to the receiver. Emitted by this thread, to be connected with
     // Qt::BlockingQueuedConnection.
     void threadGetArchiveListFinished(QList<Archive*> archives);
 

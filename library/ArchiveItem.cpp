@@ -41,7 +41,7 @@ const int NARROW_LABEL_WIDTH = 250;
 const int NARROW_LABEL_HEIGHT = 24;
 const int NARROW_PADDING_X = 12;
 const int NARROW_PADDING_TOP = 8;
-const int HANDLE_GAP = 6;      // between the text and the handle of move mode
+const int HANDLE_GAP = 6;      // between the text and the handle for move mode
 const int CHECKER_SQUARE = 15; // pixels
 
 QPixmap checkerPicture()
@@ -49,7 +49,7 @@ QPixmap checkerPicture()
     const QPixmap checker(QStringLiteral(":/checker"));
     if (!checker.isNull())
         return checker;
-    // Without the picture collection transparency still has to be told from black.
+    // Transparency has to differ from black even without the compiled-in picture.
     QPixmap drawn(2 * CHECKER_SQUARE, 2 * CHECKER_SQUARE);
     drawn.fill(QColor(102, 102, 102));
     QPainter painter(&drawn);
@@ -58,7 +58,7 @@ QPixmap checkerPicture()
     return drawn;
 }
 
-// One for all items: finding the picture among the resources takes longer than painting it.
+// Cached for all items: finding the picture among the resources takes longer than painting it.
 QBrush checkerBrush()
 {
     const QString key = QStringLiteral("ArchiveItem checker");
@@ -112,7 +112,7 @@ void ArchiveItem::initArchiveItemChildWidget(const QImage& picture)
     updateLeftChild(picture);
     updateRightChild();
     if (hasDragFlag())
-        setDragFlag(true); // over the new children
+        setDragFlag(true); // places the handle above the new children
 }
 
 void ArchiveItem::setDragFlag(bool dragFlag)
@@ -121,7 +121,7 @@ void ArchiveItem::setDragFlag(bool dragFlag)
     fitLinesToHandle();
 }
 
-// The text ends before the handle.
+// Limits the text lines to the space before the handle.
 void ArchiveItem::fitLinesToHandle()
 {
     if (mType != LIST_ITEM || !hasChildWidgets())
@@ -141,8 +141,8 @@ void ArchiveItem::createLeftChild()
     mScene = new QGraphicsScene(0, 0, LEFT_CHILD_WIDTH, CHILD_HEIGHT, this);
     mScene->setBackgroundBrush(checkerBrush());
     mPixmapItem = mScene->addPixmap(QPixmap());
-    // Within the item from the start, and its rule before the parts of the view: widgets that change their
-    // parent are styled anew, and their parts with them.
+    // The parent and the style sheet are set first: a widget is styled again, with its children, when either
+    // changes later.
     auto* view = new QGraphicsView(mScene, this);
     view->setStyleSheet(QStringLiteral("border:0;"));
     view->setEnabled(false);
@@ -184,7 +184,7 @@ void ArchiveItem::createRightChild()
 void ArchiveItem::updateContents(QImage image)
 {
     if (!hasChildWidgets()) {
-        initArchiveItemChildWidget(image); // now, or its turn would show the picture of before
+        initArchiveItemChildWidget(image); // otherwise the queued completion would show the old picture
         return;
     }
     updateLeftChild(image);
@@ -215,8 +215,8 @@ void ArchiveItem::updateRightChild()
     setTextArea();
 }
 
-// Some families, also those that stand in for missing characters, leave more room above and below than a line
-// has. What is cut off then is room above the letters and not their descenders.
+// Aligns a line that is higher than its label at the bottom. Some families, including substitutes for missing
+// characters, have more space above and below than the label, and descenders must not be cut off.
 void ArchiveItem::placeLine(QLabel* label) const
 {
     QTextLayout layout(label->text(), label->font());
@@ -238,7 +238,7 @@ void ArchiveItem::setTextArea()
         setManyTextArea();
 }
 
-// Runs over the lines word by word; what is left for the last line and does not fit is elided there.
+// Breaks the text between words into the lines; the last line takes the rest and is elided.
 void ArchiveItem::setOneTextArea(const QString& text)
 {
     const QString words = text.simplified();
@@ -292,7 +292,7 @@ ArchiveItem* ArchiveItem::clone()
     item->mOwnArchive = std::move(archive);
     item->initArchiveItemChildWidget();
     if (mPixmapItem && item->mPixmapItem)
-        item->mPixmapItem->setPixmap(mPixmapItem->pixmap()); // may be newer than the file
+        item->mPixmapItem->setPixmap(mPixmapItem->pixmap()); // the pixmap may be newer than the file
     item->setSelected(isSelected());
     item->setStyleSheet(isSelected() ? OPERATE_AND_SELECT_STATE : OPERATE_AND_UN_SELECT_STATE);
     return item;

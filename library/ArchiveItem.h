@@ -1,4 +1,3 @@
-// One title in the list: its thumbnail over a checker, and the first lines of its texts.
 #pragma once
 
 #include "touchui/KSBaseItemWidget.h"
@@ -15,6 +14,7 @@ class QGraphicsScene;
 class QGraphicsView;
 class QLabel;
 
+// One title in the list: its thumbnail on a checker pattern, and the first lines of its texts.
 class ArchiveItem : public KSBaseItemWidget
 {
     Q_OBJECT
@@ -29,11 +29,11 @@ public:
     static const int DISPLY_TEXT_SIZE = 28; // pixels
     static const int DISPLY_TEXT_SIZE_LENTH = 254;
     static const int LEFT_CHILD_LABEL_COUNT = 4;
-    static const QSize PICTURE_SIZE; // of the left child
+    static const QSize PICTURE_SIZE; // size of the thumbnail
     static const QPoint LEFT_CHILD_POS;
     static const QPoint RIGHT_CHILD_POS;
 
-    // The border marks the item that the menu acts on, the gradient the title on the canvas.
+    // Style sheets: the border marks the item that the menu acts on, the gradient the title on the canvas.
     static const QString OPERATE_AND_SELECT_STATE;
     static const QString OPERATE_AND_UN_SELECT_STATE;
     static const QString UN_OPERATE_AND_SELECT_STATE;
@@ -41,44 +41,46 @@ public:
 
     enum ItemType { LIST_ITEM = 0, NARROW_ITEM = 1 };
 
-    // The record is not owned and must live as long as the item shows it.
+    // Shows the record, which is not owned and must outlive the item.
     ArchiveItem(Archive* archive, int type, QWidget* parent = nullptr);
     ~ArchiveItem() override;
 
     Archive* getArchiveData() const { return mArchive; }
-    // Ends the item: the record goes now, and the item as soon as nothing is being delivered to it.
+    // Detaches the item from its record at once, and deletes it later, when no event is being delivered to
+    // it.
     void discard();
-    // Whether there is an item, and it has not been discarded.
+    // Returns whether the item is not null and not discarded.
     static bool isUsable(const ArchiveItem* item) { return item && item->mArchive; }
     QString getArchiveDataPath() const;
-    // Takes over the contents of the given record; the name that the item's record has is kept.
+    // Copies the contents of the given record, but keeps the name in the item's record.
     void updateArchiveData(Archive* archive);
 
-    // Held, the item is not given back by its list; see HeldArchiveItem.
+    // Prevents the list from giving the item back; see HeldArchiveItem.
     void hold() { ++mHolds; }
     void letGo() { --mHolds; }
     bool isHeld() const { return mHolds > 0; }
 
-    // Builds the thumbnail and the text lines. Without a picture it costs a picture file, so the list does it
-    // once it is on screen.
+    // Builds the thumbnail and the text lines. Reads the picture file when no picture is given, so the list
+    // calls it only for items on screen.
     void initArchiveItemChildWidget(const QImage& picture = QImage());
     bool hasChildWidgets() const { return mTextWidget != nullptr; }
 
     void updateContents(QImage image);
-    // A null image shows the title's small picture from its file, or the bare checker when there is none.
+    // Shows the image; for a null image the title's small picture from its file, or only the checker pattern
+    // if there is none.
     void updateLeftChild(QImage image);
     void updateRightChild();
 
-    // The lines that are shown, for those who cannot see them.
+    // Returns the text lines shown.
     QStringList textLines() const;
 
-    // The text lines make room for the handle.
+    // Shows or hides the handle; the text lines are shortened to make room for it.
     void setDragFlag(bool dragFlag) override;
 
-    // An item of a copied record, which the clone owns. The caller owns the clone.
+    // Returns an item for a copy of the record, which the clone owns. The caller owns the clone.
     ArchiveItem* clone() override;
 
-    // Family of the text lines of all items; items that exist follow with updateRightChild.
+    // Sets the font family of the text lines of all items; existing items change with updateRightChild().
     static void setSystemFontFamily(QString family);
     static QString SYSTEM_FONT_FAMILY;
 
@@ -93,7 +95,7 @@ private:
     void setLabelText(const QString& text, QLabel* label);
 
     Archive* mArchive;
-    std::unique_ptr<Archive> mOwnArchive; // only of a clone
+    std::unique_ptr<Archive> mOwnArchive; // set in clones only
     int mType;
     int mHolds = 0;
     QGraphicsScene* mScene = nullptr;

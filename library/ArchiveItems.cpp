@@ -80,7 +80,8 @@ std::unique_ptr<Archive> ArchiveItems::take(ArchiveItem* item)
     return record;
 }
 
-// The touch that leads here may be on its way to another finger's item, which must be there to get it.
+// Discards the items without deleting them at once: another item may still have to receive the touch event
+// that is being delivered.
 void ArchiveItems::clear()
 {
     mPictures.reset();

@@ -1,5 +1,3 @@
-// The items of the title list and the records that they show, also those that only an undo command still
-// holds. Completes items with their pictures and texts. GUI thread only.
 #pragma once
 
 #include <QList>
@@ -12,6 +10,8 @@ class ArchiveItem;
 class QWidget;
 class SmallPictures;
 
+// The items of the title list and their records, including those that only an undo command still holds.
+// Completes items with their pictures and texts. GUI thread only.
 class ArchiveItems
 {
 public:
@@ -21,25 +21,25 @@ public:
     ArchiveItems(const ArchiveItems&) = delete;
     ArchiveItems& operator=(const ArchiveItems&) = delete;
 
-    // A new item without its child widgets. The record must live as long.
+    // Makes an item without child widgets. The record must outlive the item.
     ArchiveItem* make(Archive* record);
-    // Keeps the record until its item is taken or all are cleared.
+    // Keeps the record until its item is taken or all items are cleared.
     Archive* own(std::unique_ptr<Archive> record);
 
     const QList<ArchiveItem*>& all() const { return mItems; }
-    // Null when no item has this title file.
+    // Returns the item of the title file, or null.
     ArchiveItem* find(const QString& path) const;
 
-    // Returns the items that have no child widgets, and begins to decode their pictures on another core.
+    // Returns the items without child widgets and starts decoding their pictures in another thread.
     QList<ArchiveItem*> beginToComplete();
-    // Gives the item its child widgets. An item that is gone or complete is left alone.
+    // Creates the child widgets of the item. Does nothing for an item that was taken or is complete.
     void complete(ArchiveItem* item);
-    // Whether all items that were begun with are complete.
+    // Returns whether all items returned by beginToComplete() are complete.
     bool isComplete() const { return mIncomplete.isEmpty(); }
 
-    // Ends the item and returns its record; null when that was not owned here.
+    // Discards the item and returns its record; null if that is not owned here.
     std::unique_ptr<Archive> take(ArchiveItem* item);
-    // Ends all items. Those that undo commands hold, too: the commands see it.
+    // Discards all items, including those held by undo commands, which check for that.
     void clear();
 
 private:
@@ -47,5 +47,5 @@ private:
     std::vector<std::unique_ptr<Archive>> mRecords;
     QList<ArchiveItem*> mItems;
     QList<ArchiveItem*> mIncomplete;
-    std::unique_ptr<SmallPictures> mPictures; // of the incomplete ones, in their order
+    std::unique_ptr<SmallPictures> mPictures; // pictures of mIncomplete, in the same order
 };

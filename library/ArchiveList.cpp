@@ -37,14 +37,14 @@
 namespace
 {
 
-const int ITEMS_IN_VIEW = 6;    // before the list scrolls to the selection
-const int MOST_ITEMS = 120;     // more than an operator's folder has titles
-const int ITEMS_KEPT = 60;      // when there are more than that: a few screens on both sides of the view
-const int EFFECTIVE_LEFT = 38;  // the scroll bar lies before it
+const int ITEMS_IN_VIEW = 6;    // more items than this make the list scroll to the selection
+const int MOST_ITEMS = 120;     // more titles than operators have in a folder
+const int ITEMS_KEPT = 60;      // number to keep when there are more: a few screens on both sides of the view
+const int EFFECTIVE_LEFT = 38;  // right of the scroll bar
 const int LOADER_POLL = 1;      // ms
 const int LABEL_FONT_SIZE = 13; // points
 
-// Removes what a killed process left half-written in the title folders, before anything is read from them.
+// Removes half-written files of killed processes from the title folders, before anything is read.
 void sweepTitleFolders()
 {
     const std::string root = FolderLookup::multiByte(&IPathManagerEx::getTitleResourcesPath);
@@ -74,7 +74,7 @@ ArchiveList::ArchiveList(QLabel* folderLabel, bool autoInit, QWidget* parent)
     }
     initArchiveListConnect();
     connectMenuActions();
-    SaveOutage::instance(); // from here on the order may be saved
+    SaveOutage::instance(); // the order may be saved from now on
     sweepTitleFolders();
     mController->reCreateOrderXml();
     if (autoInit)
@@ -156,7 +156,8 @@ void ArchiveList::initArchiveListData()
     mInitThread->start(QThread::InheritPriority);
 }
 
-// The loader may be waiting for this thread to take its titles: they are let in and thrown away.
+// Ends the loader. It may be blocked until this thread has taken its titles, so these are accepted and
+// dropped.
 void ArchiveList::endInitThread()
 {
     if (!mInitThread)
@@ -212,7 +213,8 @@ void ArchiveList::finishCheck()
     mRows.endCheck();
 }
 
-// A title that is shown has been read.
+// Removes the rows of unreadable titles. A row with an item was read successfully before and stays unless its
+// own read failed.
 void ArchiveList::removeUnreadable()
 {
     const QSet<std::size_t> found = mRows.takeUnreadable();
@@ -239,7 +241,7 @@ void ArchiveList::removeUnreadable()
 
 ArchiveRow* ArchiveList::archiveRow(int index) const
 {
-    return static_cast<ArchiveRow*>(row(index)); // the list adds no others
+    return static_cast<ArchiveRow*>(row(index)); // all rows of this list are of this type
 }
 
 ArchiveItem* ArchiveList::madeItem(int index) const
@@ -247,7 +249,7 @@ ArchiveItem* ArchiveList::madeItem(int index) const
     return qobject_cast<ArchiveItem*>(madeWidgetItem(index));
 }
 
-// Returns the item of the row, or of the one that follows when its file has been deleted since the check.
+// Returns the item of the row or, if its file was deleted since the check, that of the next row.
 ArchiveItem* ArchiveList::readableItem(int index)
 {
     if (index < 0)
@@ -291,7 +293,7 @@ ArchiveItem* ArchiveList::makeItem(ArchiveRow& row)
 {
     std::unique_ptr<Archive> record = row.takeRecord();
     if (!record) {
-        // Without a path nothing can be saved over what could not be read.
+        // A record without a path is never saved, so the unreadable file is not overwritten.
         record = std::make_unique<Archive>();
         QMetaObject::invokeMethod(this, &ArchiveList::removeUnreadable, Qt::QueuedConnection);
     }
@@ -320,18 +322,18 @@ void ArchiveList::slotAddOneArchiveData(ArchiveItem* item)
     beginCheck();
 }
 
-// The first screen comes before the titles that nobody looks at.
+// Starts the check once the items on screen are complete.
 void ArchiveList::beginCheck()
 {
     if (mItems.isComplete())
         mRows.beginCheck();
 }
 
-// Called after a long folder has been scrolled. Begins with what is farthest from view.
+// Gives back the items farthest from the view. Called after a long folder was scrolled.
 void ArchiveList::giveBackItems()
 {
     mGiveBackRequested = false;
-    std::vector<std::pair<int, ArchiveItem*>> made; // by their distance from view
+    std::vector<std::pair<int, ArchiveItem*>> made; // sorted by distance from the view
     for (int i = 0; i < count(); ++i) {
         if (ArchiveItem* item = madeItem(i))
             made.emplace_back(qMax(firstVisibleItem() - i, i - lastVisibleItem()), item);
@@ -472,7 +474,7 @@ QList<ArchiveOrder*> ArchiveList::getArchiveOrderList() const
 void ArchiveList::saveArchiveListOrder()
 {
     std::unordered_set<std::string> known;
-    for (const ArchiveItem* item : mItems.all()) // also those that only undo commands hold
+    for (const ArchiveItem* item : mItems.all()) // includes items that only undo commands hold
         known.insert(QFileInfo(item->getArchiveDataPath()).fileName().toStdString());
     const QList<ArchiveOrder*> orders = getArchiveOrderList();
     if (!mController->saveListedOrder(mCurrentPath, orders, known))
@@ -529,7 +531,8 @@ void ArchiveList::synchronizationFolderFile()
         mController->deleteUnusefulArchives(mCurrentPath);
 }
 
-// Whether the folder's order is not the list's: the disk has not taken it, or another program has harmed it.
+// Returns whether the order file does not match the list: its last write was refused, or another program has
+// damaged it.
 bool ArchiveList::orderIsDamaged() const
 {
     const std::string folder = mCurrentPath.toStdString();
@@ -546,7 +549,7 @@ void ArchiveList::openFolder(const QString& path)
     mController->setLastFolderPath(path);
     setDefaultItemState(getSelectedArchive());
     clearOperationItemState(getCurrentOperationArchive());
-    // Each start notice needs its end, or the old folder would stay locked for the sibling processes.
+    // Each start notice needs an end notice, otherwise the old folder stays locked for the sibling processes.
     ITitlerFolderReporter* reporter = ITitlerFolderReporter::instance();
     if (reporter && !mCurrentPath.isEmpty())
         reporter->editFolderEndStatus(mCurrentPath);
@@ -617,7 +620,7 @@ void ArchiveList::refreshArchiveListForChangeFolderName(QString before, QString 
     LOG_DEBUG_OPERATE(L"ArchiveList", 200,
                       L"ArchiveList_refreshArchiveListForChangeFolderName() Enter Before:" +
                           before.toStdWString() + L" After:" + after.toStdWString());
-    if (QDir::cleanPath(before) != QDir::cleanPath(mCurrentPath)) // a request may end with a "/"
+    if (QDir::cleanPath(before) != QDir::cleanPath(mCurrentPath)) // the path in a request may end with a "/"
         return;
     endInitThread();
     mController->setLastFolderPath(after);
@@ -634,7 +637,7 @@ void ArchiveList::refreshArchiveListForChangeFolderName(QString before, QString 
         Q_EMIT startTemplatePicker();
         return;
     }
-    // Places may differ until all titles are read, names do not.
+    // The position may change until all titles are read, the name does not.
     if (fileName.isEmpty() || !selectTitle(after + QLatin1Char('/') + fileName))
         selectArchive(qBound(0, selected, count() - 1));
 }
@@ -681,8 +684,8 @@ void ArchiveList::wheelEvent(QWheelEvent* event)
     KSScrollViewerWidget::wheelEvent(event);
 }
 
-// The title on the canvas must have been written out before it can be copied. It stays selected, which is not
-// a selection of the operator's: nothing is logged and nothing scrolls.
+// Deselects the title for a moment, so that the canvas makes its pictures before the title is copied. This is
+// not a selection by the operator: nothing is logged and the list does not scroll.
 void ArchiveList::waitForCanvas()
 {
     setDefaultItemState(getSelectedArchive());
@@ -702,20 +705,19 @@ void ArchiveList::setSystemLanFont(QString family)
 {
     setMenuFont(family);
     ArchiveItem::setSystemFontFamily(family);
-    for (ArchiveItem* item : mItems.all()) // also those that may come back
+    for (ArchiveItem* item : mItems.all()) // includes items that are not listed and may return
         item->updateRightChild();
 }
 
 void ArchiveList::translateText()
 {
     mActions->translateText();
-    // A blank label is one of a folder that was closed.
+    // The label of a closed folder stays empty.
     if (mFolderLabel && mCurrentPath.isEmpty() && !mFolderLabel->text().isEmpty())
         mFolderLabel->setText(tr("Folder"));
 }
 
-// --- Move mode: titles are dragged by their handles to another place
-// -----------------------------------------
+// --- Move mode: titles are dragged by their handles to another place ------------------------------------
 
 void ArchiveList::moveButtonClicked(bool isMoveMode)
 {
@@ -736,7 +738,7 @@ void ArchiveList::itemPressedAndHoldEvent(KSBaseItemWidget* item, QPoint pos, KS
     willMenuPopup = right && right->geometry().contains(pos);
 }
 
-// A drag on an item scrolls.
+// Lets a drag on an item scroll the list.
 void ArchiveList::itemFlickEvent(KSBaseItemWidget* item, QPoint, KSScrollViewerWidget*, bool& willFlick)
 {
     if (item)

@@ -1,10 +1,3 @@
-// The column of thumbnails: the titles of the current folder, in the folder's order.
-//
-// A tap selects a title and sends it to the canvas; a right click or a long hold opens the option menu, from
-// which titles are created, copied, pasted, deleted and saved as templates; in move mode titles are dragged
-// to another place. Every change goes out as an undo command, which the receiver takes over and pushes. The
-// selected item is the title on the canvas, the operation item the one that the menu acts on. GUI thread
-// only.
 #pragma once
 
 #include "document/Archive.h"
@@ -31,6 +24,13 @@ class QAction;
 class QLabel;
 class QUndoCommand;
 
+// The column of thumbnails: the titles of the current folder, in the order of the folder.
+//
+// A tap selects a title and sends it to the canvas; a right click or a long press opens the option menu,
+// which creates, copies, pastes and deletes titles and saves them as templates; in move mode titles are
+// dragged to another place. Every change is emitted as an undo command, which the receiver owns and pushes.
+// The selected item is the title on the canvas, the operation item the one that the menu acts on. GUI thread
+// only.
 class ArchiveList : public KSScrollViewerWidget
 {
     Q_OBJECT
@@ -41,7 +41,7 @@ public:
     static const int MENU_FONT_SIZE = 28; // pixels
 
     // The label shows the name of the folder; it is not owned and must outlive the list. With autoInit the
-    // last folder, or else the first one, is opened at once.
+    // last folder used, or otherwise the first one, is opened at once.
     ArchiveList(QLabel* folderLabel, bool autoInit, QWidget* parent = nullptr);
     ~ArchiveList() override;
 
@@ -50,19 +50,20 @@ public:
     ArchiveItem* getSelectedArchive() const { return mSelection.selected(); }
     bool IsOptionMenuShowing() const { return mActions->isMenuShowing(); }
     int getItemIndex(ArchiveItem* item) const;
-    // Null when there is no such item. Items are made when they come into view or are asked for here, and may
-    // be given back when a long folder is scrolled on; who needs one longer holds it.
+    // Returns the item, or null for an index out of range. Items are made when they scroll into view or when
+    // they are requested here, and may be given back when a long folder is scrolled on; use HeldArchiveItem
+    // to keep one.
     ArchiveItem* archiveItem(int index) const;
-    // Full path of the title file, which needs no item. Empty when there is none.
+    // Returns the full path of the title file without making an item. Empty for an index out of range.
     QString titlePath(int index) const;
     bool isMoveMode() const { return mMoveMode; }
-    // Whether an item is being dragged.
+    // Returns whether an item is being dragged.
     bool getMoveState() const { return mMoving; }
 
-    // Opens the last folder, or else the first one; its titles follow from a thread of their own.
+    // Opens the last folder used, or otherwise the first one; a thread loads its titles.
     void initArchiveList();
 
-    // Selects the item and shows it on the canvas; an index outside the list clears both.
+    // Selects the item and shows it on the canvas; an index out of range clears selection and canvas.
     void selectArchive(int index);
     // Moves the border to the item.
     void selectOperationArchive(int index);
@@ -71,49 +72,51 @@ public:
     void setOperationItemState(ArchiveItem* item) { mSelection.mark(item); }
     void clearOperationItemState(ArchiveItem* item) { mSelection.removeBorder(item); }
     void clearOldFlagState();
-    // Remembers the title as the last one and sends it to the canvas.
+    // Stores the title as the last one used and sends it to the canvas.
     void saveLastArchivePathAndNotifyCanvasUpdate(ArchiveItem* item);
 
     // Empties the list, the path and the label.
     void cleanArchiveList();
     void clearCopyArchive() { mActions->clearCopyArchive(); }
-    // Removes the files of titles that are no longer in the list, if the folder's order can be trusted to
-    // name all others.
+    // Saves the order again if its file is damaged. Removes the files of titles that are no longer in the
+    // list, unless the order could not be read when the folder was opened, or not be written since.
     void synchronizationFolderFile();
     void stopArchiveListTapAndHoldTimer() { stopTapAndHoldTimer(); }
     void setSystemLanFont(QString family);
     void translateText();
 
-    // An item without its child widgets, which follow when it is on screen. The list is its parent.
+    // Makes an item without child widgets, which are created when it is on screen. The list is its parent.
     ArchiveItem* createBaseItem(Archive* archive) { return mItems.make(archive); }
-    // The given item, or a new, complete one of the record.
+    // Returns the given item or, for null, a new one of the record, complete with child widgets.
     ArchiveItem* createPasteUndoItem(Archive* archive, ArchiveItem* item);
 
-    // The item of a row of this list, with the record that it shows. For the row.
+    // Makes the item of a row of this list, with its record. Called by the row.
     ArchiveItem* makeItem(ArchiveRow& row);
 
-    // One entry an item, with its index and file name; the caller owns the entries.
+    // Returns the index and file name of each item; the caller owns the entries.
     QList<ArchiveOrder*> getArchiveOrderList() const;
-    // What the disk refuses is kept and written when it takes it.
+    // Saves the order. If the disk refuses it, it is kept and written later.
     void saveArchiveListOrder();
 
     // Emits startTemplatePicker. Any thread.
     void startPicker() { Q_EMIT startTemplatePicker(); }
 
-    // Waits for the titles of a long folder when their number matters.
+    // Returns whether the folder has as many titles as allowed. For a long folder it waits for the check when
+    // the result depends on it.
     bool checkArchiveListIsFull();
     bool checkDiskSpaceIsFull() const;
-    // Whatever changes the list needs the final places of the titles: waits for a check that still runs.
+    // Waits for a running check of the titles. Call before the list is changed, since the check still changes
+    // the rows.
     void finishCheck();
-    // Keeps the record of an item that is to be made.
+    // Keeps the record for an item that is about to be made.
     Archive* own(std::unique_ptr<Archive> record) { return mItems.own(std::move(record)); }
-    // Blocks until the canvas has written out the selected title.
+    // Blocks until the pictures of the selected title are written.
     void waitForCanvas();
 
 Q_SIGNALS:
-    // Null: there is no title to show. The record stays the list's.
+    // Sends a title to the canvas; null when there is none to show. The list keeps owning the record.
     void signalUpdateCanvas(const Archive* archive);
-    // The receiver owns the command.
+    // Passes an undo command to the receiver, which takes ownership of it.
     void deleteCommandSignal(QUndoCommand* command);
     void pasteCommandSignal(QUndoCommand* command);
     void createCommandSignal(QUndoCommand* command);
@@ -124,7 +127,7 @@ Q_SIGNALS:
     void signalItemsCanDrag(bool canDrag);
     void startTemplatePicker();
     void startUserTemplatePicker();
-    // A title is no longer selected: the canvas makes its pictures now.
+    // Emitted when a title is deselected: the canvas makes its pictures then.
     void itemSetDefaultState();
     void archiveListMenuShow();
     void cleanUndoStack();
@@ -140,7 +143,7 @@ public Q_SLOTS:
     void moveButtonClicked(bool isMoveMode);
     void slotAddArchiveData();
     void slotAddOneArchiveData(ArchiveItem* item);
-    // A title has been saved: reads it again and shows the picture in its item.
+    // Called when a title was saved: reads it again and shows the picture in its item.
     void refreshBaseItem(QString archiveFilePath, QImage leftImage);
     void itemLongHoldEvent(KSBaseItemWidget* item, QPoint pos, KSScrollViewerWidget* scrollArea);
     void itemReleasedEvent(KSBaseItemWidget* item, QPoint pos, KSScrollViewerWidget* scrollArea);
@@ -150,15 +153,15 @@ public Q_SLOTS:
     void itemFlickEvent(KSBaseItemWidget* item, QPoint pos, KSScrollViewerWidget* scrollArea,
                         bool& willFlick);
     void selectOptionMenuItem(QAction* action) { mActions->selectOptionMenuItem(action); }
-    // Makes a title from the template's record, behind the operation item.
+    // Makes a title from the template's record, after the operation item.
     void createArchiveFromTemplate(Archive* temp) { mActions->createArchiveFromTemplate(temp); }
     void refreshArchiveList(QString path);
     void refreshArchiveListForChangeFolderName(QString before, QString after);
     void refreshArchiveListInFile(QString path, QString fileName);
-    // Takes over the records.
+    // Takes ownership of the records.
     void getArchiveListSuccessed(QList<Archive*> archivesList);
     void moveCurrentArchiveItemVisble();
-    // Not owned.
+    // Sets the canvas, which is not owned.
     void setMainScene(CanvasScene* mainScene) { mMainScene = mainScene; }
     void wheelEvent(QWheelEvent* event) override;
 
@@ -179,7 +182,7 @@ private:
     ArchiveItem* madeItem(int index) const;
     ArchiveItem* readableItem(int index);
     int findTitle(const QString& path) const;
-    // False when there is no such title, or its file cannot be read.
+    // Selects the title. Returns false when it does not exist or its file cannot be read.
     bool selectTitle(const QString& path);
     void resetPositions();
     void setFolderLabel();
@@ -190,7 +193,7 @@ private:
 
     std::unique_ptr<ArchiveController> mController;
     std::unique_ptr<ArchiveInitThread> mInitThread;
-    bool mIgnoreLoaded = false; // a loader that is being ended may still deliver
+    bool mIgnoreLoaded = false; // set while a loader is being ended, which may still deliver titles
     TitleRows mRows;
     ArchiveItems mItems;
     bool mContentsRequested = false;
@@ -198,15 +201,15 @@ private:
     std::unique_ptr<TitleMenuActions> mActions;
     QLabel* mFolderLabel;
     CanvasScene* mMainScene = nullptr;
-    // A folder whose order could not be read when it was opened, or not be written since, is not cleaned up
-    // before it is opened again.
+    // Whether unlisted title files of the folder may be removed. Withheld when the order could not be read or
+    // written, until the folder is opened again.
     enum class CleanUp { Allowed, Withheld };
     CleanUp mCleanUp = CleanUp::Withheld;
     QString mCurrentPath;
     TitleSelection mSelection;
     QPointer<ArchiveItem> mDraggedItem;
-    int mMoveSource = -1;   // row of the item that is being dragged
-    bool mMoveMode = false; // titles can be dragged
+    int mMoveSource = -1;   // row of the dragged item
+    bool mMoveMode = false; // whether titles can be dragged
     bool mMoving = false;
-    bool mLongHold = false; // the release of the finger that opened the menu selects nothing
+    bool mLongHold = false; // set by a long press: the release that follows must not select
 };

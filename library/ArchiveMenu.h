@@ -1,4 +1,3 @@
-// The option menu of the title list.
 #pragma once
 
 #include "library/ArchiveAction.h"
@@ -6,6 +5,7 @@
 
 #include <QList>
 
+// The option menu of the title list.
 class ArchiveMenu : public KSMenu
 {
     Q_OBJECT
@@ -13,10 +13,10 @@ class ArchiveMenu : public KSMenu
 public:
     explicit ArchiveMenu(QWidget* parent = nullptr);
 
-    // Sets the texts again after a change of language.
+    // Updates the texts after a change of language.
     void translateText();
 
-    // onItem: the menu was opened on a title. hasCopy: there is something to paste.
+    // Enables the entries. onItem: the menu was opened on a title. hasCopy: the clipboard contains a title.
     void enableFor(bool onItem, bool hasCopy);
 
     ArchiveAction* action(ArchiveAction::ARCHIVE_ACTION_TYPE type) const;

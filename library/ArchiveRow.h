@@ -1,5 +1,3 @@
-// A title as a row of the list. The list keeps these for all titles of a folder; the item, and with it the
-// record, is made when the row comes into view. GUI thread only.
 #pragma once
 
 #include "touchui/ScrollViewerRow.h"
@@ -12,14 +10,16 @@ class Archive;
 class ArchiveList;
 class FolderTitles;
 
+// A title as a row of the list. The list has a row for each title of a folder; the item and its record are
+// made when the row scrolls into view. GUI thread only.
 class ArchiveRow : public ScrollViewerRow
 {
 public:
-    // A title whose file is read when the record is needed. number is that of the row among the titles, which
-    // are shared; the record may be at hand already. The list must outlive the row.
+    // Makes a row for a title whose file is read when the record is needed. number is its index in the
+    // titles; record may be null. The list must outlive the row.
     ArchiveRow(ArchiveList& list, std::shared_ptr<const FolderTitles> titles, std::size_t number,
                std::unique_ptr<Archive> record);
-    // A title of which there is only the record.
+    // Makes a row for a title that exists as a record only.
     ArchiveRow(ArchiveList& list, std::unique_ptr<Archive> record);
     ~ArchiveRow() override;
 
@@ -27,14 +27,15 @@ public:
     KSBaseItemWidget* makeWidget() override;
 
     std::size_t number() const { return mNumber; }
-    // Full path of the title file; empty for a blank row.
+    // Returns the full path of the title file; empty for a blank row.
     const std::string& path() const { return mPath; }
 
-    // The record at hand, or else that of the file. Null when the file cannot be read.
+    // Returns the record, reading it from the file if needed. Null when the file cannot be read.
     std::unique_ptr<Archive> takeRecord();
-    // Takes the record of an item that is no longer needed. What is in the file is not kept.
+    // Takes back the record of an item that is given back. It is dropped if it can be read from the file
+    // again.
     void putBack(std::unique_ptr<Archive> record);
-    // Whether the file could not be read when the record was needed.
+    // Returns whether the last call of takeRecord() could not read the file.
     bool isUnreadable() const { return mIsUnreadable; }
 
 private:

@@ -1,9 +1,9 @@
-// The creation of a title travels as a PasteArchiveCommand; this command changes nothing and keeps the signal
-// that is reserved for it typed.
 #pragma once
 
 #include <QUndoCommand>
 
+// Does nothing; it is the command type of the signal for created titles. A title is created with a
+// PasteArchiveCommand.
 class CreateArchiveCommand : public QUndoCommand
 {
 public:

@@ -16,7 +16,7 @@ void DeleteArchiveCommand::redo()
     if (!ArchiveItem::isUsable(mItem))
         return;
     const QString path = mItem->getArchiveDataPath();
-    // Done again, it may meet another selection: a look around at a clean undo stack is no step.
+    // The selection may differ on redo, since selecting a title is not an undo step while the stack is clean.
     mIsSelected = mIsSelected || mList->getSelectedArchive() == mItem;
     mItem->hide();
     mList->removeWidgetItem(mItem);

@@ -1,5 +1,3 @@
-// Takes a title out of the list. Its files stay until the folder is next brought in step with its order file,
-// so that undo needs no file contents.
 #pragma once
 
 #include "library/HeldArchiveItem.h"
@@ -11,17 +9,19 @@ class ArchiveItem;
 class ArchiveList;
 class ArchiveOrder;
 
+// Removes a title from the list. Its files stay until the folder is next synchronised with its order file, so
+// undo does not need to restore them.
 class DeleteArchiveCommand : public QUndoCommand
 {
 public:
-    // The list must outlive the command. An item that the list has dropped meanwhile makes it do nothing.
+    // The list must outlive the command. Does nothing when the list has discarded the item.
     DeleteArchiveCommand(ArchiveList* list, ArchiveItem* item, int position, bool isSelected,
                          QUndoCommand* parent = nullptr);
 
     void redo() override;
     void undo() override;
 
-    // One entry a listed title as of now; the caller owns the entries.
+    // Returns the current order of the listed titles; the caller owns the entries.
     QList<ArchiveOrder*> getArchiveOrderList() const;
 
 private:

@@ -2,7 +2,7 @@
 
 #include <QRegularExpressionValidator>
 
-// Tells why a folder name is refused. GUI thread.
+// Validates a folder name and reports why it is refused. GUI thread.
 class EditorRegExpValidator : public QRegularExpressionValidator
 {
     Q_OBJECT
@@ -10,7 +10,7 @@ class EditorRegExpValidator : public QRegularExpressionValidator
 public:
     explicit EditorRegExpValidator(const QString& pattern, QObject* parent = nullptr);
 
-    // The verdict of the pattern; every call sends one of the signals.
+    // Returns the result of the pattern and emits one of the signals.
     State validate(QString& input, int& position) const override;
 
 Q_SIGNALS:

@@ -1,5 +1,3 @@
-// A change of the selected title. Describes a tap that the list has already carried out; a run of taps merges
-// into one step.
 #pragma once
 
 #include "library/HeldArchiveItem.h"
@@ -9,6 +7,8 @@
 class ArchiveItem;
 class ArchiveList;
 
+// A change of the selected title, which the list has already carried out. Consecutive changes are merged into
+// one undo step.
 class FocusArchiveCommand : public QUndoCommand
 {
 public:

@@ -27,7 +27,7 @@ FolderEditor::FolderEditor(QWidget* parent)
 {
     setFocusPolicy(Qt::StrongFocus);
     setContextMenuPolicy(Qt::NoContextMenu);
-    setAttribute(Qt::WA_AcceptTouchEvents); // else the list behind takes the finger for its own
+    setAttribute(Qt::WA_AcceptTouchEvents); // otherwise the list below it handles the touch
     setFrame(false);
     QFont nameFont = font();
     nameFont.setPixelSize(FONT_SIZE);
@@ -41,7 +41,7 @@ FolderEditor::FolderEditor(QWidget* parent)
 
     connect(&mFinger, &OneFinger::acted, this,
             [this](QEvent::Type type) { sendMouse(type, mFinger.position()); });
-    // Outside: the field is let go of, but not clicked.
+    // A release outside the field ends the press without a click.
     connect(&mFinger, &OneFinger::cancelled, this,
             [this] { sendMouse(QEvent::MouseButtonRelease, mapToGlobal(QPointF(-1, -1))); });
 
@@ -113,7 +113,8 @@ void FolderEditor::drawFrame(QPainter& painter) const
     }
 }
 
-// A row that goes takes its editor along; a dialog that hides does not.
+// Reports the end of the edit when the editor itself is hidden together with its row, but not when the dialog
+// is hidden.
 void FolderEditor::hideEvent(QHideEvent* event)
 {
     QLineEdit::hideEvent(event);

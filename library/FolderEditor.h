@@ -1,5 +1,3 @@
-// The field in which a folder's name is edited in its row. Enter, Escape and the end of the soft keyboard are
-// told, not acted upon: its owner decides when the edit is over. GUI thread.
 #pragma once
 
 #include "touchui/OneFinger.h"
@@ -8,6 +6,8 @@
 #include <QLineEdit>
 #include <QPixmap>
 
+// The field in which a folder's name is edited in its row. It only reports Enter, Escape and the closing of
+// the soft keyboard; its owner ends the edit. GUI thread.
 class FolderEditor : public QLineEdit
 {
     Q_OBJECT
@@ -21,15 +21,15 @@ public:
     explicit FolderEditor(QWidget* parent = nullptr);
 
 Q_SIGNALS:
-    // What was typed or pasted is refused for its characters, for its length, or taken.
+    // Emitted when the text typed or pasted contains refused characters, is too long, or is valid.
     void signalInvalidInput();
     void signalLongInput();
     void signalValidInput();
-    // The editor has left its row, whatever became of the text.
+    // Emitted when the editor was removed from its row, with or without a change of the name.
     void signalEditStateEnd();
     void signalPressedEnter();
     void signalPressedEscape();
-    // The soft keyboard was closed.
+    // Emitted when the soft keyboard was closed.
     void signalPressedClose();
 
 protected:
@@ -39,7 +39,7 @@ protected:
     void hideEvent(QHideEvent* event) override;
 
 private:
-    // The text, its selection and its caret are QLineEdit's, inside this rectangle.
+    // Returns the rectangle in which QLineEdit draws the text, the selection and the caret.
     QRect getTextRect() const;
     void drawFrame(QPainter& painter) const;
     void sendMouse(QEvent::Type type, const QPointF& globalPosition);

@@ -100,7 +100,7 @@ bool FolderNameEdit::openEditor(const QModelIndex& index, FolderEdit action)
     m_row = index;
     m_tree->setCurrentIndex(index);
     Q_EMIT m_tree->editorEvent(index);
-    if (!m_editor) { // the tree refused
+    if (!m_editor) { // the tree did not open an editor
         slotEditStateEnd();
         return false;
     }
@@ -150,7 +150,7 @@ void FolderNameEdit::slotPressedEnter()
         renameAction();
 }
 
-// A name that is refused is not left behind.
+// Keeps the field open while its name is refused.
 void FolderNameEdit::slotPressedClose()
 {
     if (m_nameValid)
@@ -250,7 +250,7 @@ void FolderNameEdit::slotEditStateEnd()
         if (reporter && QFileInfo(m_rows->folderPath(m_oldName)).isDir())
             reporter->changeTitlerFolderName(m_rows->folderPath(m_oldName), m_rows->folderPath(m_oldName));
     } else if (action != FOLDER_EDIT_NONE) {
-        // The tree is still at its editor; the row of a folder that was not made is removed after that.
+        // The tree is still closing its editor, so the row of a folder that was not created is removed later.
         const QString source =
             action == FOLDER_EDIT_DUPLICATE ? QFileInfo(m_duplicateSource).fileName() : QString();
         const QPersistentModelIndex row = index;
@@ -259,7 +259,7 @@ void FolderNameEdit::slotEditStateEnd()
     }
 }
 
-// The row that was current before is so again.
+// Removes the row and makes the row that was current before current again.
 void FolderNameEdit::dropUnmadeRow(const QPersistentModelIndex& row, const QString& source)
 {
     if (!row.isValid())
@@ -296,7 +296,7 @@ bool FolderNameEdit::makeFolder(const QString& name, const QModelIndex& index)
     setRow(index, name);
     m_rows->insertChildrenIndex(index, name);
     if (!QFileInfo(m_rows->folderPath(name)).isDir()) {
-        m_committed = false; // its row is removed with the editor
+        m_committed = false; // the row is removed when the editor is closed
         ListMessages::post(isCopy ? MessageDef::MESSAGE_DISK_FULL_ON_DUPLICATE
                                   : MessageDef::MESSAGE_DISK_FULL_ON_CREATE,
                            QCoreApplication::translate("FolderPicker", "folder"));
@@ -306,7 +306,7 @@ bool FolderNameEdit::makeFolder(const QString& name, const QModelIndex& index)
 
 void FolderNameEdit::doRename(const QString& name, const QModelIndex& index)
 {
-    // A rename that the disk refuses leaves the row under the name that the folder has.
+    // When the disk refuses the rename, the row keeps the old name.
     const bool renamed = m_rows->disk().renameFolder(m_rows->regetRootPath(), m_oldName, name);
     const QString now = renamed ? name : m_oldName;
     if (renamed) {
@@ -314,7 +314,7 @@ void FolderNameEdit::doRename(const QString& name, const QModelIndex& index)
         m_rows->factory()->renameFolder(m_oldName, name);
         m_rows->insertChildrenIndex(index, name);
     } else if (name != m_oldName) {
-        if (QFileInfo::exists(m_rows->folderPath(name))) // made by others meanwhile
+        if (QFileInfo::exists(m_rows->folderPath(name))) // created by another process meanwhile
             ListMessages::post(MessageDef::MESSAGE_RENAME_FAILED, name);
         else
             ListMessages::post(MessageDef::MESSAGE_DISK_FULL_ON_CREATE,

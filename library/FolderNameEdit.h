@@ -12,9 +12,9 @@ class FolderEditor;
 class FolderRows;
 class KSTreeView;
 
-// The editing of a folder's name in its row: of a folder that is renamed, made, or made as a copy of another.
-// Opens the field with its soft keyboard, refuses names that are in use, and brings what was typed to the
-// disk. GUI thread.
+// Edits a folder's name in its row: of a folder that is renamed, created, or created as a copy of another.
+// Opens the field with the soft keyboard, refuses names in use, and carries out the change on the disk. GUI
+// thread.
 class FolderNameEdit : public QObject
 {
     Q_OBJECT
@@ -22,47 +22,49 @@ class FolderNameEdit : public QObject
 public:
     enum FolderEdit { FOLDER_EDIT_NONE = 0, FOLDER_EDIT_RENAME, FOLDER_EDIT_CREATE, FOLDER_EDIT_DUPLICATE };
 
-    // Neither the rows nor the tree are owned, and no edit is active when the tree is deleted.
+    // Neither the rows nor the tree are owned. No edit may be active when the tree is deleted.
     FolderNameEdit(FolderRows* rows, KSTreeView* tree, QObject* parent);
 
-    // FOLDER_EDIT_NONE while nothing is edited.
+    // Returns the kind of the edit, FOLDER_EDIT_NONE without one.
     FolderEdit action() const { return m_action; }
     bool isActive() const { return m_action != FOLDER_EDIT_NONE; }
-    // Null while no field is open.
+    // Returns the field, or null while none is open.
     FolderEditor* editor() const;
-    // The row that is being edited; invalid for none.
+    // Returns the row that is being edited; invalid without an edit.
     QModelIndex row() const { return m_row; }
-    // The same, if the folder is only being made and does not exist yet.
+    // Returns the row that is being edited if its folder is not created yet; invalid otherwise.
     QModelIndex unmadeRow() const;
-    // Returns whether the box is up that reports a name in use.
+    // Returns whether the message about a name in use is shown.
     bool isMessageUp() const { return m_messageUp; }
     void forgetMessage() { m_messageUp = false; }
 
     void startRename(const QModelIndex& index);
-    // Return whether the field is open in a new row at the end of the tree. source is the name of a folder.
+    // Open the field in a new row at the end of the tree. Return whether it is open. source is the name of a
+    // folder.
     bool startCreate(const QString& name);
     bool startDuplicate(const QString& source, const QModelIndex& sourceRow);
-    // Ends the edit with what was typed. Returns true when that cannot be, since the name is in use.
+    // Ends the edit and applies the text. Returns true when the edit has to continue, since the name is in
+    // use.
     bool renameAction();
-    // Ends the edit and drops what was typed.
+    // Ends the edit and discards the text.
     void cancelEdit();
 
     // Opens the soft keyboard for the field, if there is one.
     void callSoftKeyBoard();
     static void closeSoftKeyBoard();
 
-    // Follow what other processes do to folders; plain names. Whether it is the folder that is being renamed:
-    // then the edit goes on from the new name.
+    // Called when another process renamed a folder; plain names. isRenaming() returns whether that folder is
+    // the one being renamed here, in which case goOnFrom() continues the edit from the new name.
     void sourceRenamed(const QString& before, const QString& after);
     bool isRenaming(const QString& name) const;
     void goOnFrom(const QString& name);
 
 Q_SIGNALS:
-    // Full paths; comes before the row has the new name.
+    // Emitted before the row gets the new name. Full paths.
     void folderMoved(QString before, QString after);
     void rowAdded();
-    // The row of a folder that was not made has been removed. The row that was current before is so again, if
-    // there was any.
+    // Emitted when the row of a folder that was not created has been removed. isFolderCurrent: the row that
+    // was current before is current again.
     void unmadeRowDropped(bool isFolderCurrent);
 
 public Q_SLOTS:
@@ -74,7 +76,7 @@ public Q_SLOTS:
     void slotLongInput();
     void slotValidInput();
     void messageClosed(MessageDefine::tagCloseParam param);
-    // What was typed is to be carried out.
+    // Called when the text of the field has to be applied.
     void doEdit(const QString& name, const QModelIndex& index);
 
 private:
@@ -96,6 +98,6 @@ private:
     QString m_oldName;
     QString m_duplicateSource; // full path
     bool m_nameValid = true;
-    bool m_committed = false; // the text of this edit has reached the disk
+    bool m_committed = false; // whether the text was applied on the disk
     bool m_messageUp = false;
 };

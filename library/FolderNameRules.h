@@ -1,21 +1,21 @@
-// What a title folder may be called.
 #pragma once
 
 #include <QString>
 
+// The rules for the name of a title folder.
 namespace FolderNameRules
 {
 
-// In characters, not in the units of a QString.
+// Counted in characters, not in UTF-16 units.
 constexpr int LONGEST_NAME = 20;
 
-// The characters that other systems refuse are refused here, too.
+// Excludes the characters that other systems do not allow either.
 inline const QString PATTERN = QStringLiteral("[^][=|/\\\\:;,.*<>?\"]{0,20}$");
 
 bool isTooLong(const QString& name);
-// Names that differ in case alone would clash elsewhere. Blanks count.
+// Ignores case, since names that differ only in case would be the same on other systems. Spaces count.
 bool isSameName(const QString& first, const QString& second);
-// Whether the name can be that of a folder in the root and nowhere else, whoever gave it.
+// Returns whether the name, which may come from outside, is a plain name that cannot lead out of the root.
 bool isFolderName(const QString& name);
 
 } // namespace FolderNameRules

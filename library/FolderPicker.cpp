@@ -42,9 +42,9 @@ const int FRAME_MARGIN = 9;
 const int SEPARATOR_HEIGHT = 4;
 const int DATE_WIDTH = 250;
 const int BUTTON_SPACE = 8;
-const int SIDE_MARGIN = FRAME_MARGIN + BUTTON_SPACE; // beside what lies in the frame
+const int SIDE_MARGIN = FRAME_MARGIN + BUTTON_SPACE; // between the frame and the widgets
 constexpr QSize BUTTON_SIZE(160, 48);
-// Inside the frame, which is dark by itself.
+// Area of the frame, which is drawn dark.
 constexpr QMargins FRAME(7, 9, 7, 9);
 constexpr QColor FRAME_COLOR(17, 17, 17);
 constexpr QColor FRAME_LINE_COLOR(85, 85, 85);
@@ -59,7 +59,7 @@ QString plainName(const std::wstring& nameOrPath)
     return QString::fromStdWString(nameOrPath).section(QLatin1Char('/'), -1, -1, QString::SectionSkipEmpty);
 }
 
-// Whether the current row is a title in that folder, which is closed.
+// Returns whether the current row is a title in that folder and the folder is collapsed.
 bool isCurrentHiddenBy(const KSTreeView& tree, const QModelIndex& folder)
 {
     return tree.currentIndex().parent() == folder && !tree.isExpanded(folder);
@@ -99,7 +99,7 @@ FolderPicker::FolderPicker(QWidget* parent)
     setStyleSheet(QStringLiteral("QDialog#FolderPickerWindow {font-size:24px; background:rgb(50, 50, 50);}"));
     setAttribute(Qt::WA_AcceptTouchEvents);
     setFixedSize(FOLDER_PICKER_SIZE);
-    new WindowPlaceKeeper(this); // child of this
+    new WindowPlaceKeeper(this); // owned by this dialog
     createTree();
     mEdit = std::make_unique<FolderNameEdit>(&mRows, mTree, nullptr);
     createDetails();
@@ -115,7 +115,7 @@ FolderPicker::FolderPicker(QWidget* parent)
 
 FolderPicker::~FolderPicker()
 {
-    // What the editor and the tree send while they are destroyed would reach a dialog that is half destroyed.
+    // Deleted first, so that their signals do not reach a partly destroyed dialog.
     const QPointer<FolderEditor> editor = mEdit->editor();
     mEdit->cancelEdit();
     delete editor;
@@ -137,7 +137,8 @@ void FolderPicker::createTree()
     mTree->setCheckBoxVisible(false);
     mTree->setSortingEnabled(true);
     mTree->setHorizontalScrollBarPolicy(Qt::ScrollBarAlwaysOff);
-    mTree->setVerticalScrollBarPolicy(Qt::ScrollBarAlwaysOn); // else the columns would jump
+    // Otherwise the columns would change their width.
+    mTree->setVerticalScrollBarPolicy(Qt::ScrollBarAlwaysOn);
     mTree->header()->setStretchLastSection(false);
     mTree->header()->setSectionResizeMode(FolderPickerFactory::NameColumn, QHeaderView::Stretch);
     mTree->header()->setSectionResizeMode(FolderPickerFactory::DateColumn, QHeaderView::Fixed);
@@ -280,8 +281,8 @@ void FolderPicker::pressedFolder(QModelIndex indexPress)
 {
     if (!indexPress.isValid())
         return;
-    // Opening and closing a folder picks it, so that the buttons act on what was touched last. A title of it
-    // that was chosen stays so for as long as it can be seen.
+    // Expanding or collapsing a folder selects it, so that the buttons act on what was touched last. A
+    // selected title of the folder stays selected while it is visible.
     const QPersistentModelIndex pressed = indexPress.siblingAtColumn(FolderPickerFactory::NameColumn);
     if (mRows.folderOf(mTree->currentIndex()) != mRows.folderOf(pressed) ||
         isCurrentHiddenBy(*mTree, pressed))
@@ -319,7 +320,7 @@ void FolderPicker::startEditing(QModelIndex index)
     mEdit->startRename(index);
 }
 
-// Returns whether the folder has been deleted by others without notice; its row is removed then.
+// Returns whether the folder was deleted without a notice by another process, and removes its row then.
 bool FolderPicker::isVanished(const QModelIndex& index)
 {
     const QString name = mRows.nameOf(mRows.folderOf(index));
@@ -337,7 +338,7 @@ void FolderPicker::showSoftKeyboard()
 
 // --- The buttons ----------------------------------------------------------------------------------------
 
-// Ends the edit of a name before something else is done. Returns true when it has to go on.
+// Ends the edit of a name before another action. Returns true when the edit has to continue.
 bool FolderPicker::isEditKept()
 {
     return mEdit->isActive() && mEdit->renameAction();
@@ -425,7 +426,7 @@ void FolderPicker::folderNameChanged(FileManagerDefine::tagChangeFolderNameParam
     if (mRows.isNameOf(before, currentFolderName())) {
         mRows.openFolderRenamed(after);
         Q_EMIT folderNameChange(oldPath, newPath);
-        // The steps back speak of the old path, also that of a text that was just being typed.
+        // The undo steps, including that of text just being typed, contain the old path.
         Q_EMIT clearUndoCommandStack();
     }
     if (isVisible())
@@ -437,7 +438,7 @@ void FolderPicker::renameRow(const QString& before, const QString& after)
     mEdit->sourceRenamed(before, after);
     mRows.factory()->renameFolder(before, after);
     if (mEdit->isRenaming(before)) {
-        continuefolderNameChanged(after); // the edit goes on from the new name
+        continuefolderNameChanged(after); // continues the edit from the new name
         return;
     }
     const QModelIndex index = mRows.getFolderIndex(before, mEdit->row());
@@ -454,7 +455,7 @@ void FolderPicker::slotDeleteFolder(std::wstring name)
     const QString folder = plainName(name);
     const QString path = mRows.folderPath(folder);
     if (FolderNameRules::isFolderName(folder) && !QFileInfo::exists(path))
-        RefusedWrites::forgetFolder(path.toStdString()); // what could not be saved is not wanted
+        RefusedWrites::forgetFolder(path.toStdString()); // pending writes for a deleted folder are dropped
     if (mRows.isNameOf(folder, currentFolderName()))
         setCurrentFolderName(QString());
     const QModelIndex index = mRows.getFolderIndex(folder, mEdit->unmadeRow());
@@ -495,7 +496,7 @@ void FolderPicker::showEvent(QShowEvent* event)
         move(window->mapToGlobal(window->rect().center()) - rect().center());
 }
 
-// However it was closed, no name stays half edited.
+// Cancels an edit when the dialog is hidden, however it was closed.
 void FolderPicker::hideEvent(QHideEvent* event)
 {
     if (!event->spontaneous()) {

@@ -1,7 +1,3 @@
-// The dialog in which the operator picks the folder of titles to work in, or a title of it: a tree of the
-// folders under the root of the titles, with a picture of the pressed title. Folders are made, copied and
-// renamed in place, and what other processes do to them is followed while the dialog shows. It lives as long
-// as the main window and is shown by exec(). GUI thread.
 #pragma once
 
 #include "library/FolderNameEdit.h"
@@ -28,12 +24,16 @@ class KSTreeView;
 class QLabel;
 class TitlePreview;
 
+// The dialog in which the operator picks the folder of titles to work in, or a title in it: a tree of the
+// folders under the root of the titles, with a picture of the pressed title. Folders are created, copied and
+// renamed in their rows, and changes by other processes are shown while the dialog is open. It exists as long
+// as the main window and is shown with exec(). GUI thread.
 class FolderPicker : public QDialog
 {
     Q_OBJECT
 
 public:
-    static const int LEFT_WIDTH = 240; // of the picture of a title, whose height is next
+    static const int LEFT_WIDTH = 240; // width of the picture of a title; its height follows
     static const int WIDGET_HEIGHT = 135;
     static const int HSEPARATOR_LENGTH = 1069;
     static const int LIMIT_REMAIN = FolderPickerController::LIMIT_REMAIN;
@@ -46,7 +46,7 @@ public:
     static const QString COLOR_TRANSPARENT;
     static const QString FOLDER_NAME_REGEXP;
 
-    // Which of Duplicate, New Folder, Open and Cancel can be pressed; any other value: all of them.
+    // Which of Duplicate, New Folder, Open and Cancel are enabled; any other value enables all.
     enum _folderButtonState {
         ALL_BUTTONS = 0,
         NO_DUPLICATE = 1,
@@ -62,41 +62,43 @@ public:
     explicit FolderPicker(QWidget* parent = nullptr);
     ~FolderPicker() override;
 
-    // Marks the folder that is open in the editor, which cannot take a new name meanwhile. Empty: none is.
+    // Marks the folder that is open in the editor, which cannot be renamed meanwhile. Empty for none.
     void setCurrentFolderName(const QString& name) { mRows.setOpenFolder(name); }
     QString currentFolderName() const { return mRows.openFolder(); }
     void setSystemLanFont(QFont font);
     void translateText();
-    // Reads all folders anew; what was selected and being edited is dropped.
+    // Reads all folders again; drops the selection and an edit.
     void updateTreeView();
-    // Opens the keyboard again when a name is being edited.
+    // Opens the soft keyboard again while a name is being edited.
     void showSoftKeyboard();
 
     void setDuplicateButtonEnabled(bool enabled);
     void setCreateFolderButtonEnabled(bool enabled);
     void setCancelButtonEnabled(bool enabled);
 
-    // Nothing was picked from the dialog above this one: the folder that is being opened leaves this one
-    // open.
+    // Keeps this dialog open when the folder being opened needs a template and none is picked in the dialog
+    // above.
     void setKeepFolderDialog() { mKeepDialog = true; }
-    // Darkens the dialog while another of this process is above it.
+    // Darkens this dialog while another dialog of this process is above it.
     void showOpacityWidget(bool show);
     void showDialogMaskWidget(bool show) { mMasks.showDialogMaskWidget(show); }
     void showMessageMaskWidget(bool show) { mMasks.showMessageMaskWidget(show); }
 
     KSTreeView* treeView() const { return mTree; }
     KSTreeModel* treeModel() const { return mRows.model(); }
-    // Null while no name is being edited.
+    // Returns the field, or null while no name is being edited.
     FolderEditor* editor() const { return mEdit->editor(); }
     FolderEdit editAction() const { return mEdit->action(); }
 
 Q_SIGNALS:
-    // Full paths of folders; the name of a title file.
+    // Emitted when the operator has picked a folder or a title. Full paths of folders; the name of a title
+    // file.
     void changeFolderPath(QString path);
     void changeFolderFile(QString path, QString fileName);
-    // The folder that is open in the editor was renamed elsewhere.
+    // Emitted when another process has renamed the folder that is open in the editor.
     void folderNameChange(QString before, QString after);
-    // A folder was renamed, here or elsewhere, whether it is open or not. Comes first.
+    // Emitted when this or another process has renamed a folder, whether it is open or not. Comes before
+    // folderNameChange().
     void folderMoved(QString before, QString after);
     void clearUndoCommandStack();
     void signalCancelClicked();
@@ -109,14 +111,14 @@ public Q_SLOTS:
     void ChangeButtonState(folderButtonState state);
     void slotCloseSoftwareKeyBoardForFileManager() { FolderNameEdit::closeSoftKeyBoard(); }
 
-    // The tree.
+    // Slots of the tree
     void pressedFolder(QModelIndex indexPress);
     void startEditing(QModelIndex index);
     void slotCurrentChangedByTouch(QModelIndex index);
-    // The rows are sorted by the column now.
+    // Called when the rows were sorted by the column.
     void slotHeaderClicked(int column);
 
-    // The editor.
+    // Slots of the editor
     void slotCreateEditor(FolderEditor* editor) { mEdit->slotCreateEditor(editor); }
     void slotPressedClose() { mEdit->slotPressedClose(); }
     void slotPressedEnter() { mEdit->slotPressedEnter(); }
@@ -124,16 +126,17 @@ public Q_SLOTS:
     void slotInvalidInput() { mEdit->slotInvalidInput(); }
     void slotLongInput() { mEdit->slotLongInput(); }
     void slotValidInput() { mEdit->slotValidInput(); }
-    void slotTextChanged(QString) {} // the field keeps what is typed
-    // A message box was closed.
+    void slotTextChanged(QString) {} // the field itself keeps the text
+    // Called when a message box was closed.
     void reCallcallSoftKeyBoard(MessageDefine::tagCloseParam param) { mEdit->messageClosed(param); }
 
-    // What the file manager has done to folders. Names, or full paths whose last part is taken.
+    // Called when another process renamed or deleted a folder. Takes names or full paths, of which the last
+    // part is used.
     void folderNameChanged(FileManagerDefine::tagChangeFolderNameParam param);
     void continuefolderNameChanged(QString after) { mEdit->goOnFrom(after); }
     void slotDeleteFolder(std::wstring name);
 
-    // Escape and the window manager: Cancel, where that can be pressed.
+    // Called on Escape and by the window manager: acts like Cancel if that is enabled.
     void reject() override;
 
 protected:

@@ -58,7 +58,7 @@ bool FolderPickerController::duplicateFolder(const QString& root, const QString&
     const QString target = root + QLatin1Char('/') + name;
     if (copyFolderFile(QDir(source), QDir(target)))
         return true;
-    QDir(target).removeRecursively(); // half a folder is none
+    QDir(target).removeRecursively(); // no partial copy is kept
     return false;
 }
 

@@ -1,37 +1,39 @@
-// The folder picker's work on the disk: the folders under the root of the titles. Has no widgets. Names are
-// plain names of folders in the root; one that is none is refused. Results say whether it was done; what
-// fails leaves things as they were. GUI thread; nothing here waits for the disk to have written.
 #pragma once
 
 #include <QDir>
 #include <QFileInfo>
 #include <QString>
 
+// File operations of the folder picker on the folders under the root of the titles. Has no widgets. Names are
+// plain names of folders in the root; others are refused. The functions return whether they succeeded; a
+// failed one changes nothing. GUI thread; none of them waits until the disk has synced.
 class FolderPickerController
 {
 public:
     static const int LIMIT_REMAIN = 200; // with KB_MILLION: kilobytes that must stay free on the disk
     static const int KB_MILLION = 1000;
 
-    // No folder, one that cannot be read, or one without entries.
+    // Returns whether the folder is missing, unreadable or empty.
     bool isNullDirectory(const QFileInfo& folder) const;
-    // Whether there is such a folder, and not by a link to a place outside of the root.
+    // Returns whether the folder exists and is not a link to a place outside the root.
     bool isTitleFolder(const QString& root, const QString& name) const;
-    // Whether a folder of this name, which need not exist, would be below the root with all links resolved.
+    // Returns whether a folder of this name, which need not exist, would be below the root after all links
+    // are resolved.
     bool staysBelow(const QString& root, const QString& name) const;
-    // Without a slash at its end.
+    // Returns the root without a slash at its end.
     QString getTitlerRootFolder() const;
-    // All that a folder holds, with its order. Files that cannot be read are left out, and the result false.
+    // Copies the contents of a folder and its order file. Leaves out files that cannot be read and returns
+    // false then.
     bool copyFolderFile(const QDir& source, const QDir& target) const;
 
     bool createFolder(const QString& root, const QString& name) const;
-    // False also when another folder or file has the new name.
+    // Returns false also when a folder or file with the new name exists.
     bool renameFolder(const QString& root, const QString& oldName, const QString& newName) const;
-    // Makes the folder and copies what the source, a full path, holds. False when any of it cannot be copied;
-    // the folder is not left half made then.
+    // Creates the folder and copies the contents of the source, a full path. Returns false when any of it
+    // cannot be copied; the new folder is removed then.
     bool duplicateFolder(const QString& root, const QString& source, const QString& name) const;
 
-    // Whether less would be free than the limit, the limit included, or that cannot be told. withFolderSize:
-    // with another folder like this one.
+    // Returns whether less free space than the limit would be left, or the space is unknown. withFolderSize:
+    // after another folder of this size is made.
     bool isDiskFull(const QString& path, bool withFolderSize) const;
 };

@@ -20,7 +20,7 @@ namespace
 
 const QLatin1String TITLE_EXTENSION(".xml");
 
-// A node is a folder's number and, counted from 1, a title's place in it.
+// A node holds the number of a folder and, in the lower bits, the position of a title in it, counted from 1.
 constexpr int TITLE_BITS = 16;
 constexpr quintptr TITLE_MASK = (quintptr(1) << TITLE_BITS) - 1;
 
@@ -96,7 +96,7 @@ void FolderPickerFactory::renameFolder(const QString& oldName, const QString& ne
     const int number = mNumbers.take(oldName);
     if (number == 0)
         return;
-    // A folder that had the new name before has gone; its number stands for nothing now.
+    // Another folder that had the new name does not exist any more; its number gets an empty name.
     if (const int gone = mNumbers.value(newName); gone != 0)
         mFolderNames[gone] = QString();
     mNumbers.insert(newName, number);
@@ -144,7 +144,7 @@ void FolderPickerFactory::forgetTitles(int folder)
     mHasTitles.remove(folder);
 }
 
-// A view asks it of every row that it paints.
+// The result is kept, since a view calls this for every row that it paints.
 bool FolderPickerFactory::hasTitles(int folder)
 {
     if (mTitleInfos.contains(folder))
@@ -270,7 +270,7 @@ void FolderPickerFactory::setTextAlignmentAttribute(KSModelAttributeItem* item) 
     item->setAttribute(Qt::TextAlignmentRole, static_cast<int>(Qt::AlignLeft | Qt::AlignVCenter), NameColumn);
 }
 
-// Only folders take another name, and only in their name's cell.
+// Makes only the name cells of folders editable.
 void FolderPickerFactory::setItemEditableAttribute(KSModelAttributeItem* item, bool folder) const
 {
     item->setAttributeMaxKey(KSVIEW::ItemEditableRole, DateColumn);

@@ -1,9 +1,3 @@
-// Fills the tree of the folder picker from the disk: the folders under the root of the titles, each with the
-// titles that its order file names and that are there. A folder's titles are read when they are first needed.
-//
-// A node is a number that stays with its folder, also through a rename, so that handles outlive every
-// re-reading: one whose folder or title has gone has no neighbours, no children and an empty file name. GUI
-// thread.
 #pragma once
 
 #include "library/FolderPickerController.h"
@@ -20,6 +14,12 @@
 
 class FolderEditor;
 
+// Fills the tree of the folder picker from the disk: the folders under the root of the titles, each with the
+// existing titles that its order file names. The titles of a folder are read when they are first needed.
+//
+// A node is a number that belongs to a folder permanently, even when it is renamed, so nodes stay valid when
+// the disk is read again. The node of a folder or title that no longer exists has no neighbours, no children
+// and an empty file name. GUI thread.
 class FolderPickerFactory : public KSModelDataFactory
 {
     Q_OBJECT
@@ -32,34 +32,34 @@ public:
 
     explicit FolderPickerFactory(QObject* parent = nullptr);
 
-    // Without a slash at its end; nothing is read until importSourceData().
+    // Sets the root, without a slash at its end; call importSourceData() to read it.
     void setRootPath(const QString& path) { mRootPath = path; }
     QString rootPath() const { return mRootPath; }
-    // Of the rows that are made from now on.
+    // Sets the font of the rows that are made from now on.
     void setItemFont(const QFont& font) { mFont = font; }
 
-    // The name cells of folders have one, which signalCreateEditor announces.
+    // Creates an editor for the name cell of a folder and emits signalCreateEditor(); null for other cells.
     QWidget* createControl(QWidget* parent, _controlType type, const QModelIndex& index) override;
     bool isControlSelfEnding() const override { return true; }
     void importSourceData() override;
     void* getNextNode(void* node) override;
     void* getChildNode(void* node) override;
-    // Reads no more titles than it takes to know.
+    // Stops reading at the first title.
     bool hasChildNode(void* node) override;
     void InstallItemAttribute(KSModelAttributeItem* item, void* node) override;
 
-    // Of a folder under the root, whether it is there or not.
+    // Returns the entry of a folder under the root, which need not exist.
     QFileInfo getNewFolderInfo(const QString& name) const;
-    // The titles of the folder in the order of its order file.
+    // Returns the titles of the folder in the order of its order file.
     QList<QFileInfo> getTitlerFiles(int folder, const QString& path);
-    // What the node stands for: a folder or a title file; empty for the root.
+    // Returns the folder or title file of the node; empty for the root.
     QFileInfo getNodeInfo(void* node);
-    // Names the folder as a node, which it becomes when it is none yet; its titles are read anew.
+    // Returns the node of the folder, new if it has none yet; its titles are read again.
     void* takeFolder(const QString& name);
-    // The folder of the old name goes on under the new one.
+    // Transfers the node of the old name to the new one.
     void renameFolder(const QString& oldName, const QString& newName);
 
-    // All attributes of a folder's row. The name is what the row shows, whatever the disk says.
+    // Sets all attributes of a folder's row. The row shows the given name, even if info has another one.
     void setFolderAttribute(KSModelAttributeItem* item, const QString& name, const QFileInfo& info) const;
 
 Q_SIGNALS:
@@ -71,7 +71,7 @@ public Q_SLOTS:
 private:
     void getChildInfo(const QString& path, int folder);
     void ensureChildInfo(int folder);
-    // Whether the folder has titles, for which only some of them may have to be looked at.
+    // Returns whether the folder has titles. Reads only until the first one is found.
     bool hasTitles(int folder);
     void forgetTitles(int folder);
     QList<QFileInfo> firstTitlerFiles(const QString& path, qsizetype most) const;
@@ -88,11 +88,11 @@ private:
     FolderPickerController mDisk;
     QString mRootPath;
     QFont mFont;
-    QList<int> mFolders;                     // in their order
-    QHash<QString, int> mNumbers;            // of every folder that was ever seen
-    QMap<int, QString> mFolderNames;         // the other way round
-    QMap<int, QList<QFileInfo>> mTitleInfos; // of the folders whose titles have been read
+    QList<int> mFolders;                     // in display order
+    QHash<QString, int> mNumbers;            // by name, of all folders seen so far
+    QMap<int, QString> mFolderNames;         // names by number
+    QMap<int, QList<QFileInfo>> mTitleInfos; // of the folders whose titles were read
     QMap<int, QStringList> mTitleNames;
-    QMap<int, bool> mHasTitles; // of the folders that were asked about
+    QMap<int, bool> mHasTitles; // results of hasTitles()
     QPointer<FolderEditor> mEditor;
 };

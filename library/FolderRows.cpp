@@ -67,7 +67,7 @@ QModelIndex FolderRows::getFolderIndex(const QString& name, const QModelIndex& s
     return found;
 }
 
-// The name may come in another case, except where it is the very name of another folder.
+// The case of the name may differ, unless another folder has exactly this name.
 bool FolderRows::isNameOf(const QString& name, const QString& folder) const
 {
     if (folder.isEmpty() || !FolderNameRules::isSameName(name, folder))

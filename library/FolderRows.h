@@ -10,8 +10,8 @@ class FolderPickerFactory;
 class KSTreeModel;
 class QObject;
 
-// The rows of the folder picker's tree: folders below the root of the titles, and their titles below them.
-// Knows which folder is open in the editor and cannot take a new name meanwhile. GUI thread.
+// The rows of the folder picker's tree: folders below the root of the titles, with their titles as children.
+// Knows which folder is open in the editor and cannot be renamed meanwhile. GUI thread.
 class FolderRows
 {
 public:
@@ -22,38 +22,38 @@ public:
     FolderPickerFactory* factory() const { return m_factory; }
     const FolderPickerController& disk() const { return m_disk; }
 
-    // Looks the root up again and reads all folders anew.
+    // Looks up the root again and reads all folders again.
     void reload();
-    // Returns the root of the titles, which is looked up when it is not known.
+    // Returns the root of the titles; looks it up if it is not known yet.
     QString regetRootPath();
-    // Full path of a folder in the root, whether it exists or not.
+    // Returns the full path of a folder in the root, which need not exist.
     QString folderPath(const QString& name) const;
 
     bool checkItemisFolder(const QModelIndex& index) const;
-    // Returns the row of the folder; a title stands for its folder.
+    // Returns the row of the folder; for a title that of its folder.
     QModelIndex folderOf(const QModelIndex& index) const;
     QString nameOf(const QModelIndex& index) const;
-    // The row of the folder of that name. Names that differ in case alone may both be there: the very name
-    // comes first.
+    // Returns the row of the folder with the name. An exact match is preferred to one that differs in case.
     QModelIndex getFolderIndex(const QString& name, const QModelIndex& skipped = QModelIndex()) const;
-    // Returns whether a name that comes from another process stands for the folder.
+    // Returns whether a name received from another process means the folder.
     bool isNameOf(const QString& name, const QString& folder) const;
     bool hasTitles(const QModelIndex& folder) const;
     int titleCount(const QModelIndex& folder) const;
-    // The file of a title's row.
+    // Returns the file of a title's row.
     QFileInfo titleFile(const QModelIndex& title) const;
 
-    // Fill the row of a folder: for one that is being made, and for one that is there.
+    // Fill the row of a folder: the first for a new folder, the second for an existing one.
     void setDefauleItemAttribute(const QModelIndex& index, const QString& name);
     void setAttributeAtDoEdit(const QModelIndex& index, const QString& name);
-    // Puts the titles of the folder below its row.
+    // Inserts the titles of the folder below its row.
     void insertChildrenIndex(const QModelIndex& index, const QString& name);
     void remove(const QModelIndex& index);
 
-    // The folder that is open in the editor; empty for none. setOpenFolder makes the one before editable.
+    // Returns the folder that is open in the editor; empty for none. setOpenFolder() makes the previous one
+    // editable again.
     QString openFolder() const { return m_openFolder; }
     void setOpenFolder(const QString& name);
-    // Follows a rename of the open folder by others, whose row is changed by the caller.
+    // Call when another process renamed the open folder. The caller changes the row.
     void openFolderRenamed(const QString& name) { m_openFolder = name; }
 
 private:

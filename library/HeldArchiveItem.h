@@ -1,11 +1,11 @@
-// A title's item that an undo command will need again: while it is held the list does not give its widgets
-// back. Null once the list has been emptied. GUI thread only.
 #pragma once
 
 #include <QPointer>
 
 class ArchiveItem;
 
+// A title's item that an undo command needs later: while it is held, the list does not give it back. Null
+// after the list was emptied. GUI thread only.
 class HeldArchiveItem
 {
 public:

@@ -1,25 +1,25 @@
-// What the title list has to know of the request that the operator is working on.
-// The application implements it; the list and its undo commands only ask and report.
 #pragma once
 
 #include <string>
 
+// What the title list needs to know about the request that the operator is working on. The application
+// implements it; the list and its undo commands only query it and report to it.
 class IEditContext
 {
 public:
     virtual ~IEditContext() = default;
 
-    // True while a peer waits for new titles: the list then offers a template at once.
+    // Returns whether a peer waits for new titles: the list then offers a template at once.
     virtual bool isCreateNew() = 0;
-    // True when the title, named by its plain file name, was made during this request.
+    // Returns whether the title, given by its plain file name, was created during this request.
     virtual bool isNewCreateFile(std::wstring fileName) = 0;
     virtual void insertFilePath(std::wstring fileName) = 0;
     virtual void deleteFilePath(std::wstring fileName) = 0;
 
-    // The one context, not owned. Null is allowed and means that nobody asked for anything. GUI thread.
+    // Returns the instance, which is not owned; null means that there is no request. GUI thread.
     static IEditContext* instance() { return sInstance; }
     static void setInstance(IEditContext* context) { sInstance = context; }
-    // isCreateNew of the one context; false without one.
+    // Returns isCreateNew() of the instance; false without one.
     static bool isCreateNewNow() { return sInstance && sInstance->isCreateNew(); }
 
 private:

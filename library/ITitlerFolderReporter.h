@@ -1,25 +1,25 @@
-// Tells the file manager which title folder is being edited or renamed. The application implements it.
 #pragma once
 
 #include <QString>
 
+// Reports to the file manager which title folder is being edited or renamed. The application implements it.
 class ITitlerFolderReporter
 {
 public:
     virtual ~ITitlerFolderReporter() = default;
 
-    // Full folder paths. An empty path is reported to nobody.
+    // Report that editing has begun or ended. Full folder paths; an empty path is not reported.
     virtual void editFolderStartStatus(QString folder) = 0;
     virtual void editFolderEndStatus(QString folder) = 0;
-    // The order of the folder's titles has changed without a title coming or going.
+    // Reports that the order of the titles in the folder has changed, without a title added or removed.
     virtual void updateTitlerOrder(QString folder) = 0;
 
-    // The operator has begun to rename the folder.
+    // Reports that the operator has begun to rename the folder.
     virtual void renameFolderStartStatus(QString folder) = 0;
-    // How that ended; both are the same when the folder kept its name.
+    // Reports the end of a rename; both paths are equal when the folder kept its name.
     virtual void changeTitlerFolderName(QString oldPath, QString newPath) = 0;
 
-    // The one reporter, not owned; null reports nothing. GUI thread.
+    // Returns the instance, which is not owned; null when nothing is reported. GUI thread.
     static ITitlerFolderReporter* instance() { return sInstance; }
     static void setInstance(ITitlerFolderReporter* reporter) { sInstance = reporter; }
 

@@ -1,4 +1,3 @@
-// Moves a title to another place in the list. Describes a drag that the list has already made.
 #pragma once
 
 #include "library/HeldArchiveItem.h"
@@ -10,6 +9,7 @@ class ArchiveItem;
 class ArchiveList;
 class ArchiveOrder;
 
+// Moves a title to another place in the list. The list has already carried out the drag.
 class MoveArchiveCommand : public QUndoCommand
 {
 public:
@@ -19,7 +19,7 @@ public:
     void redo() override;
     void undo() override;
 
-    // One entry a listed title as of now; the caller owns the entries.
+    // Returns the current order of the listed titles; the caller owns the entries.
     QList<ArchiveOrder*> getArchiveOrderList() const;
 
 private:

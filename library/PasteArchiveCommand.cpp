@@ -9,7 +9,7 @@ PasteArchiveCommand::PasteArchiveCommand(ArchiveList* list, Archive* archive, in
     : QUndoCommand(parent)
     , mList(list)
     , mItem(list->createPasteUndoItem(archive, nullptr))
-    // The menu may have been opened on a title that is gone by now.
+    // The title on which the menu was opened may have been removed meanwhile.
     , mOperationPosition(qBound(-1, operationPosition, list->count() - 1))
     , mSelectedPosition(selectedPosition)
 {

@@ -1,4 +1,3 @@
-// Adds a title, new or pasted, behind the operation item.
 #pragma once
 
 #include "library/HeldArchiveItem.h"
@@ -9,10 +8,11 @@ class Archive;
 class ArchiveItem;
 class ArchiveList;
 
+// Adds a new or pasted title after the operation item.
 class PasteArchiveCommand : public QUndoCommand
 {
 public:
-    // Makes the item. The list and the record must outlive the command; positions below 0 mean none.
+    // Makes the item. The list and the record must outlive the command; negative positions mean none.
     PasteArchiveCommand(ArchiveList* list, Archive* archive, int operationPosition, int selectedPosition,
                         QUndoCommand* parent = nullptr);
 

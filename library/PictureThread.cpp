@@ -21,7 +21,7 @@ const QSize PictureThread::THUMBNAIL_MIDDLE_SIZE(960, 540);
 namespace
 {
 
-// Empty for what cannot be a picture's.
+// Returns an empty path for a name that is not valid for a picture.
 QString picturePath(const Archive& archive, const std::string& name)
 {
     return QString::fromStdString(TitlerUtility::getPicturePathFromTitlePath(archive.getPath(), name));
@@ -91,11 +91,12 @@ void PictureThread::run()
             mJobs.pop_front();
         }
         saveArchiveThumnail(*job.archive, job.big, job.middle);
-        // The clean-up takes the title file first: what it found there it removes after this. Where the whole
-        // folder is away nothing was written: what is kept follows the folder, or goes with it.
+        // A deletion removes the title file first, then the pictures that exist at that time; those written
+        // since are removed here. If the whole folder is missing, nothing was written, and the kept pictures
+        // are moved or dropped with the folder.
         if (job.hadTitle && !hasTitle(*job.archive))
             removePictures(*job.archive);
-        job = Job(); // the images go before the job counts as finished
+        job = Job(); // frees the images before the job counts as finished
         --mUnfinished;
     }
 }
@@ -124,8 +125,8 @@ void PictureThread::saveArchiveThumnail(const Archive& archive, const QImage& bi
     const QString blackPath = picturePath(archive, archive.getThumbnailBlack());
     const QString smallPath = picturePath(archive, archive.getThumbnailSmall());
 
-    // Four fifths of the work are in the big picture, which has a core of its own meanwhile. A picture that
-    // cannot be written is kept or passed over: the others still help.
+    // The big picture takes four fifths of the time, so it is written in a thread of its own. A picture that
+    // cannot be written is kept or skipped; the others are still useful.
     const std::string title = archive.getPath();
     std::future<bool> bigSaved =
         std::async(std::launch::async, [&] { return PngWriter::saveOrKeep(big, bigPath, title); });

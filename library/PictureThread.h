@@ -1,5 +1,3 @@
-// Writes the four pictures of a title off the GUI thread, in the order in which they were asked for. Each
-// replaces the one before when it is complete; the disk may sync them later.
 #pragma once
 
 #include <QImage>
@@ -14,6 +12,8 @@
 
 class Archive;
 
+// Writes the four pictures of each title in its own thread, in the order of the calls. Each file is replaced
+// when the new one is complete; the disk may sync it later.
 class PictureThread : public QThread
 {
     Q_OBJECT
@@ -23,26 +23,26 @@ public:
     static const QSize THUMBNAIL_MIDDLE_SIZE;
 
     explicit PictureThread(QObject* parent = nullptr);
-    // Drops what is still queued, lets the job at hand finish and ends the thread.
+    // Drops the queued jobs, waits for the current one and ends the thread.
     ~PictureThread() override;
 
-    // Queues one job; keeps a copy of the record. The first image is the 1920x1080 picture, the second the
-    // 960x540 one. A null record or fewer images do nothing. A title that is deleted before its pictures are
-    // in place keeps none of them. Pictures that the disk refuses are kept (RefusedWrites). GUI thread; never
-    // waits for a picture.
+    // Queues one job with a copy of the record. The first image is the 1920x1080 picture, the second the
+    // 960x540 one. Does nothing for a null record or fewer images. If the title is deleted before its
+    // pictures are written, they are removed again. Pictures that cannot be written are kept by
+    // RefusedWrites. GUI thread; never waits for a picture.
     void addArchive(const Archive* archive, QList<QImage> images);
 
-    // True when no job is queued or being written. From the moment a job is queued this is false until its
+    // Returns whether no job is queued or being written: false from the moment a job is queued until its
     // files are in place. Any thread.
     bool isThreadWaiting() const;
 
-    // Jobs queued or being written. Any thread.
+    // Returns the number of jobs queued or being written. Any thread.
     int unfinished() const { return mUnfinished; }
 
-    // Queued jobs for titles of the folder go to its new name. Any thread.
+    // Redirects queued jobs for titles of a renamed folder to its new path. Any thread.
     void folderRenamed(const QString& before, const QString& after);
 
-    // The record's files lie in the folder's new place, if they lay in it.
+    // Changes the path of the record to the new folder if it is in the old one.
     static void moveToFolder(Archive& archive, const QString& before, const QString& after);
 
 protected:
@@ -53,7 +53,7 @@ private:
         std::unique_ptr<Archive> archive;
         QImage big;
         QImage middle;
-        bool hadTitle = false; // whether there was a title file when the job was queued
+        bool hadTitle = false; // whether the title file existed when the job was queued
     };
 
     void saveArchiveThumnail(const Archive& archive, const QImage& big, const QImage& middle);

@@ -1,4 +1,3 @@
-// Writes title files off the GUI thread, in the order in which they were asked for.
 #pragma once
 
 #include "document/CanvasController.h"
@@ -11,16 +10,18 @@
 
 class Archive;
 
+// Writes title files in its own thread, in the order of the calls.
 class SceneThread : public QThread
 {
     Q_OBJECT
 
 public:
     explicit SceneThread(QObject* parent = nullptr);
-    // Drops what is still queued, lets the job at hand finish and ends the thread.
+    // Drops the queued jobs, waits for the current one and ends the thread.
     ~SceneThread() override;
 
-    // Queues a copy of the record; it is written to the record's own path. Null does nothing. GUI thread.
+    // Queues a copy of the record, which is written to the record's own path. Does nothing for null. GUI
+    // thread.
     void addArchive(const Archive* archive);
 
 protected:

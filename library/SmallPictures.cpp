@@ -48,7 +48,7 @@ QImage SmallPictures::read(const QString& path, QSize bounds)
     return fitted(PictureReader::read(path), bounds);
 }
 
-// A picture of foreign making may be of any size; what does not fit would only cost memory.
+// Pictures made by other programs may have any size; scaling them down saves memory.
 QImage SmallPictures::fitted(const QImage& picture, QSize bounds)
 {
     const bool fits = picture.width() <= bounds.width() && picture.height() <= bounds.height();

@@ -1,4 +1,3 @@
-// Decodes the small pictures of a folder's titles on another core while the list builds its items.
 #pragma once
 
 #include <QImage>
@@ -10,25 +9,27 @@
 #include <memory>
 #include <vector>
 
+// Decodes the small pictures of a folder's titles in another thread while the list builds its items.
 class SmallPictures
 {
 public:
-    // Begins with the first path. A picture that is larger than the bounds is scaled into them.
+    // Starts decoding at the first path. A picture that is larger than the bounds is scaled down to them.
     SmallPictures(const QStringList& paths, QSize bounds);
-    // Leaves what is not decoded yet.
+    // Skips the pictures that are not decoded yet.
     ~SmallPictures();
     SmallPictures(const SmallPictures&) = delete;
     SmallPictures& operator=(const SmallPictures&) = delete;
 
     qsizetype count() const { return static_cast<qsizetype>(mPictures.size()); }
-    // The picture at the index, null when it cannot be read; each can be taken once. Decodes it when its turn
-    // has not come.
+    // Returns the picture at the index, null when it cannot be read; each can be taken once. Decodes it here
+    // if its decoding has not started.
     QImage take(qsizetype index);
 
-    // Null for what is no picture file. Any thread.
+    // Returns the picture scaled down to the bounds; null for a file that is not a picture. Any thread.
     static QImage read(const QString& path, QSize bounds);
 
-    // Null and pictures within the bounds stay as they are.
+    // Returns the picture scaled down to the bounds; null pictures and those within the bounds stay as they
+    // are.
     static QImage fitted(const QImage& picture, QSize bounds);
 
 private:
@@ -39,7 +40,7 @@ private:
         std::atomic<State> state = State::Waiting;
     };
 
-    // False when another thread has begun it.
+    // Decodes the picture. Returns false if another thread has already started that.
     bool decode(Picture& picture) const;
 
     QSize mBounds;

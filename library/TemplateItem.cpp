@@ -54,7 +54,8 @@ void TemplateItem::paintEvent(QPaintEvent* event)
 {
     if (!mIsLoaded) {
         mIsLoaded = true;
-        // The checker is the picture's own ground, so that it fills it whatever the size of the tile.
+        // The checker pattern is drawn into the picture, so that it has the picture's size, not that of the
+        // item.
         setIcon(QPixmap::fromImage(TemplateThumbnail::onChecker(TemplateThumbnail::read(mImagePath))));
     }
     TouchEventButton::paintEvent(event);

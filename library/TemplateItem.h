@@ -1,5 +1,3 @@
-// One thumbnail in the template picker: the picture of a template over a checker, framed when it is chosen.
-// The picture is read when the item is first painted.
 #pragma once
 
 #include "touchui/TouchEventButton.h"
@@ -8,6 +6,8 @@
 
 class UserTemplateMenu;
 
+// One thumbnail in the template picker: the picture of a template on a checker pattern, with a frame when it
+// is selected. The picture is read when the item is first painted.
 class TemplateItem : public TouchEventButton
 {
     Q_OBJECT
@@ -23,16 +23,16 @@ public:
     void setIndex(int index) { mIndex = index; }
     bool isUser() const { return mIsUser; }
 
-    // Path of a picture of 240 x 135 pixels; larger ones are scaled down. The bare checker shows when there
-    // is none, when it cannot be read, and when it is so large that it is no thumbnail.
+    // Sets the path of a picture of 240 x 135 pixels; larger ones are scaled down. Only the checker pattern
+    // is shown when there is no path, or when the picture cannot be read or is too large for a thumbnail.
     void setImage(QString path);
     void setNormalStyle();
     void setSelectedStyle();
     bool hasSelectedStyle() const { return mHasSelectedStyle; }
 
-    // What a tap does: takes the selected style and emits itemSelected.
+    // Called on a tap: shows the selected style and emits itemSelected().
     void clickTriggered();
-    // Opens the option menu beside a user template; does nothing for a preset.
+    // Opens the option menu at a user template; does nothing for a preset.
     void showMenu();
 
 Q_SIGNALS:

@@ -35,18 +35,18 @@ const QSize TemplatePicker::TOOLBARBTN_SIZE(220, 40);
 namespace
 {
 
-const int DIALOG_FRAME = 7; // kind of frame
+const int DIALOG_FRAME = 7; // kind, see DrawBoundingRectangle
 const int TITLE_FONT_SIZE = 28;
 const int FONT_SIZE = 24;
 const int CAPTION_HEIGHT = 34;
 constexpr QMargins FRAME(10, 6, 9, 12);
 
-// In the dialog.
+// In coordinates of the dialog.
 const int TABS_LEFT = (TemplatePicker::SCREEN_WIDTH - TemplatePicker::TAB_AREA_WIDTH) / 2;
 const int TABS_TOP = 62 + TemplatePicker::PARTS_SPACE;
 const int BUTTONS_TOP = (747 + TemplatePicker::SCREEN_HEIGHT - TemplatePicker::OUTER_MARGIN_HIGHT) / 2 - 20;
 
-// In the tab widget.
+// In coordinates of the tab widget.
 const int PANE_LEFT = TemplatePicker::TAB_AREA_OUTTER_MARGIN_WIDTH;
 const int PANE_TOP = TemplatePicker::TABS_HIGHT + TemplatePicker::PAINS_SPACE;
 const int PANE_WIDTH = TemplatePicker::SCROLL_AREA_WIDTH + 2 * TemplatePicker::PAIN_LINE;
@@ -55,21 +55,22 @@ const int PROPERTY_LEFT = PANE_LEFT + PANE_WIDTH + TemplatePicker::PAINS_SPACE;
 const int NOT_FOUND_NUMBER = 400;
 const int WARNING_PRIORITY = 4;
 
-// What stands behind the last "/", if it is not the end.
+// Returns the last part of the path; a "/" at its end is ignored.
 QString lastPartOf(const QString& path)
 {
     return QFileInfo(QDir::cleanPath(path)).fileName();
 }
 
-// The folder that holds the file of this path; a path that ends with "/" is that of the folder.
+// Returns the folder that contains the file of this path; for a path that ends with "/" that folder itself.
 QString folderOf(const QString& path)
 {
     const QString clean = QDir::cleanPath(path);
     return path.endsWith(QLatin1Char('/')) ? clean : QFileInfo(clean).path();
 }
 
-// The template that a path leads to. Others name any file in its folder, or the folder itself, with a
-// "/" or not; for what does not lead to a template it is the name of the path's folder.
+// Returns the name of the template for a path, which other processes give as any file in its folder or as the
+// folder itself, with or without a "/" at its end. If neither is a template, returns the name of the folder
+// that contains the path.
 QString templateNameIn(const TemplateTab& tab, const QString& path)
 {
     const QString name = lastPartOf(folderOf(path));
@@ -93,7 +94,7 @@ TemplatePicker::TemplatePicker(QWidget* parent)
     setObjectName(QStringLiteral("TemplateOverview"));
     setStyleSheet(QStringLiteral(" QWidget#TemplateOverview { background:transparent; }"));
     setAttribute(Qt::WA_TranslucentBackground);
-    new WindowPlaceKeeper(this); // child of this
+    new WindowPlaceKeeper(this); // owned by this dialog
     setAttribute(Qt::WA_AcceptTouchEvents);
     setFixedSize(SCREEN_SIZE);
     mTitle = createLabel(this, QRect(TABS_LEFT, OUTER_MARGIN_HIGHT, TAB_AREA_WIDTH, LINE_RECT.top() - 9),
@@ -109,7 +110,7 @@ TemplatePicker::TemplatePicker(QWidget* parent)
 
 TemplatePicker::~TemplatePicker()
 {
-    // The tabs look at the controllers.
+    // Deleted first, since the tabs use the controllers.
     delete mTabs;
 }
 
@@ -140,7 +141,7 @@ QLabel* TemplatePicker::createLabel(QWidget* parent, const QRect& area, const ch
     return label;
 }
 
-// What stands beside the grid; all of it is placed when the tabs know where their pages are.
+// Creates the widgets beside the grid. They are placed later, when the tab pages have their places.
 void TemplatePicker::createPropertyArea()
 {
     const QRect none;
@@ -151,7 +152,7 @@ void TemplatePicker::createPropertyArea()
     mTextCaption = createLabel(mUserTab, none, "textCaption");
     mPreview = new ArchiveItem(&mPreviewArchive, ArchiveItem::NARROW_ITEM, mUserTab);
     mPreview->initArchiveItemChildWidget();
-    mPreview->setFixedWidth(PROPERTY_AREA_PARTS_WIDTH); // as the box of the name
+    mPreview->setFixedWidth(PROPERTY_AREA_PARTS_WIDTH); // same width as the box of the file name
     mDeleteButton2 = createButton(mUserTab, QPoint(), "deleteTemplateButton");
     connect(mDeleteButton2, &QPushButton::clicked, this, &TemplatePicker::deleteClicked2);
 }
@@ -221,7 +222,7 @@ void TemplatePicker::showEvent(QShowEvent* event)
     QDialog::showEvent(event);
     if (mFrame.isNull()) {
         mFrame = DrawBoundingRectangle().paintBoundingRectangle(DIALOG_FRAME);
-        setMask(mFrame.mask()); // black corners without a compositor
+        setMask(mFrame.mask()); // otherwise the corners are black without a compositor
     }
     if (const QWidget* window = parentWidget())
         move(window->mapToGlobal(window->rect().center()) - rect().center());
@@ -239,7 +240,7 @@ void TemplatePicker::showEvent(QShowEvent* event)
         mPresetTab->mapFrom(mTabs, QPoint(0, PANE_TOP + SCROLL_AREA_HIGHT + 2 * PAIN_LINE)).y();
     mDeleteButton2->move(place.x() + (width - TOOLBARBTN_SIZE.width()) / 2,
                          bottom - TOOLBARBTN_SIZE.height());
-    updateUserTemplateArea(); // the name is cut to the room that it has
+    updateUserTemplateArea(); // elides the name to the width it has now
 }
 
 void TemplatePicker::updateFilenameArea(const QString& name)
@@ -415,7 +416,7 @@ void TemplatePicker::slotSaveAsTemplate(QString name)
     mUserController.addNewTemplateToLastInOrderXml(name.toStdString());
     TemplateItem* item = addNewTemplateToLast(archive.release());
     if (isRead)
-        mUserTab->select(item); // what the picker scrolls to
+        mUserTab->select(item); // the picker scrolls to the selected item
 }
 
 void TemplatePicker::slotImportNewUserTemplate(QString name)
@@ -434,7 +435,8 @@ void TemplatePicker::slotImportNewUserTemplate(QString name)
     if (result < 0)
         ListMessages::post(MessageDef::MESSAGE_DISK_FULL_ON_TEMPLATE, name);
     if (result < 1) {
-        // No such folder, or no room: there is nothing to offer, nor is what had the name before.
+        // The folder does not exist or the disk is full, so the template is not offered. A previous template
+        // of this name does not exist any more either.
         mUserController.removeFromOrderXml(name.toStdString());
         return;
     }

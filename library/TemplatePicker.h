@@ -1,7 +1,3 @@
-// The dialog in which the operator picks what a new title starts from: a tab of the presets of the system
-// language, and a tab of the operator's own templates, of which the file name and the texts are shown and
-// which can be deleted there. It lives as long as the main window and is shown by exec(); closing keeps the
-// choice. GUI thread.
 #pragma once
 
 #include "document/Archive.h"
@@ -29,6 +25,9 @@ class QPushButton;
 class TemplateTab;
 class TitlerTabWidget;
 
+// The dialog in which the operator picks the template for a new title: a tab with the presets of the system
+// language, and a tab with the user templates, which shows file name and texts and has a Delete button. It
+// exists as long as the main window and is shown with exec(); closing it keeps the selection. GUI thread.
 class TemplatePicker : public QDialog
 {
     Q_OBJECT
@@ -62,16 +61,16 @@ public:
     explicit TemplatePicker(QWidget* parent = nullptr);
     ~TemplatePicker() override;
 
-    // Reads the presets again where the language calls for it.
+    // Reads the presets again if the language requires it.
     void reloadTemplates(SystemSetupDef::emSystemLanguageType language);
-    // Reads the operator's templates again.
+    // Reads the user templates again.
     void reloadTemplates2();
-    // Turns to the operator's templates and shows the last of them.
+    // Switches to the user templates and shows the last of them.
     void showUserTemplateTab();
-    // Takes the record over.
+    // Takes ownership of the record.
     TemplateItem* addNewTemplateToLast(Archive* archive);
 
-    // Whether a template was taken since this was last set.
+    // Returns whether a template was picked since setSelectedItem(false).
     bool isSelectedItem() const { return mSelectedItem; }
     void setSelectedItem(bool selected) { mSelectedItem = selected; }
 
@@ -86,15 +85,15 @@ public:
     TemplateTab* userTab() const { return mUserTab; }
 
 Q_SIGNALS:
-    // The record stays the picker's and is valid during the call.
+    // Emitted when a template was picked. The picker owns the record, which is valid during the call.
     void selectedTemplate(Archive* archive);
-    // A question is about to be shown over the soft keyboard.
+    // Emitted before a question is shown, so that the soft keyboard is closed.
     void signalCloseSoftwareKeyBoardForFileManager();
 
 public Q_SLOTS:
-    // What happened to template folders: saved by the list, or reported by the file manager. Names are those
-    // of folders. A path is that of a folder or of any file in it, and serves as the name of an import as
-    // well. A rename or delete of what is no template is logged and changes nothing.
+    // Called when a template folder was saved by the list or changed by the file manager. Names are those of
+    // folders. A path is that of a folder or of any file in it; an import may pass a path as its name. A
+    // rename or delete of a folder that is not a template is logged and ignored.
     void slotSaveAsTemplate(QString name);
     void slotImportNewUserTemplate(QString name);
     void slotRenameUserTemplate(QString oldName, QString newName, QString path);
@@ -135,11 +134,10 @@ private:
     TemplatePickerController mController;
     UserTemplatePickerController mUserController;
     TemplateReloadRule mReloadRule;
-    bool mPin = false; // the Chinese presets whatever the language
+    bool mPin = false; // use the Chinese presets for every language
     SystemSetupDef::emInformationModel mModule = SystemSetupDef::emInformationModelDefault;
     bool mSelectedItem = false;
-    // The template that the operator has been asked about; an answer that comes when another is chosen is
-    // none.
+    // The template of the question being shown. The answer is ignored when another one is selected by then.
     QPointer<TemplateItem> mAskedItem;
 
     TitlerTabWidget* mTabs = nullptr;

@@ -1,4 +1,3 @@
-// Feeds the tab of the preset templates. GUI thread.
 #pragma once
 
 #include "library/ITemplateSource.h"
@@ -8,11 +7,12 @@
 
 class Archive;
 
+// The source of the preset templates. GUI thread.
 class TemplatePickerController : public ITemplateSource
 {
 public:
-    // The Chinese set for the Chinese language, and for every language while pin is set; else the English
-    // one. The caller owns the records.
+    // Returns the Chinese set for the Chinese language and, with pin, for every language; otherwise the
+    // English set. The caller owns the records.
     QVector<Archive*> getTemplates(SystemSetupDef::emSystemLanguageType language, bool pin);
     std::string getLastSelectedTemplate() override;
     void saveSelectedTemplate(std::string path) override;

@@ -1,13 +1,13 @@
-// When the preset templates have to be read again: their set follows the system language, unless it is pinned
-// to the Chinese one.
 #pragma once
 
 #include "messaging/services/SystemSetupDef.h"
 
+// Decides when the preset templates have to be read again: the set depends on the system language, unless it
+// is pinned to Chinese.
 class TemplateReloadRule
 {
 public:
-    // For the set that is shown now.
+    // language and pin are those of the set that is shown now.
     TemplateReloadRule(SystemSetupDef::emSystemLanguageType language, bool pin)
         : mLanguage(language), mLastPin(pin)
     {
@@ -20,7 +20,7 @@ public:
         return pin != mLastPin || !pin;
     }
 
-    // To be told of each reload.
+    // Call after each reload.
     void reloaded(SystemSetupDef::emSystemLanguageType language, bool pin)
     {
         mLanguage = language;

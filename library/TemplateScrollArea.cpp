@@ -15,7 +15,7 @@ const QSize TemplateScrollArea::TOUCH_RECT_SIZE(50, 50);
 namespace
 {
 
-// Narrower than in other lists: four columns and the bar fill the area.
+// Narrower than in other lists, so that four columns and the bar fit into the area.
 const char SCROLL_BAR_STYLE[] =
     "QScrollBar:vertical { margin: 0px; border: 0px; width: 27px; background-color: rgb(51, 51, 51) }"
     "QScrollBar::up-arrow:vertical { height: 0px } QScrollBar::down-arrow:vertical { height: 0px }"
@@ -43,7 +43,7 @@ void TemplateScrollArea::initTouch()
     verticalScrollBar()->installEventFilter(this);
 }
 
-// Nothing was tapped, and nothing goes on moving.
+// Drops the pressed button and stops the motion. Called when the touch was cancelled.
 void TemplateScrollArea::rest()
 {
     mFlicker.cancel();
@@ -135,7 +135,7 @@ void TemplateScrollArea::sendPressToViewport(const QPoint& global)
     QCoreApplication::sendEvent(viewport(), &press);
 }
 
-// One step of the content, by half of the way that is left.
+// Scrolls by half of the distance that is left. Called for each step of the motion.
 void TemplateScrollArea::getDistance()
 {
     changeScrollBarValue(FlickMotion::pixels(mFlicker.advance()).y());
@@ -147,7 +147,7 @@ void TemplateScrollArea::changeScrollBarValue(int distance)
     bar->setValue(FlickMotion::scrolledValue(bar->value(), distance, bar->minimum(), bar->maximum()));
 }
 
-// The area and its bar hand wheel events on to each other.
+// Filters wheel events, since the area and its scroll bar forward them to each other.
 void TemplateScrollArea::wheelEvent(QWheelEvent* event)
 {
     stopFlick();

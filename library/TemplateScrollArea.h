@@ -1,8 +1,3 @@
-// A grid that one finger scrolls and taps. The motion runs on after the finger has left and dies at either
-// end; a finger that comes down while it runs stops it and taps nothing. Further fingers change nothing.
-//
-// It filters the touches of itself, its viewport and the buttons in it, on which the owner installs it as
-// event filter. GUI thread.
 #pragma once
 
 #include "touchui/Flicker.h"
@@ -16,6 +11,11 @@ class QPushButton;
 class QTouchEvent;
 class TouchEventButton;
 
+// A grid that one finger scrolls and taps. After a flick it keeps moving until it slows down or reaches an
+// end; a finger that comes down meanwhile stops it and does not tap. Further fingers are ignored.
+//
+// It filters the touch events of itself, its viewport and its buttons; the owner installs it as event filter
+// of the buttons. GUI thread.
 class TemplateScrollArea : public QScrollArea
 {
     Q_OBJECT
@@ -27,16 +27,16 @@ public:
 
     explicit TemplateScrollArea(QWidget* parent = nullptr);
 
-    // Lets touches in. Called once the area has its viewport and scroll bar.
+    // Enables touch events. Call when viewport and scroll bar exist.
     void initTouch();
     void stopFlick() { mFlicker.stop(); }
-    // Whether the finger and the point that follows it are as near as they get.
+    // Returns whether the content has caught up with the finger.
     bool isFlickEnd() const { return mFlicker.isEnd(); }
-    // For a button that is taken out of the grid: a finger on it gets no further.
+    // Call before a button is removed from the grid: cancels a touch on it.
     void letGoOf(TouchEventButton* button);
 
 Q_SIGNALS:
-    // A tap on a button; not after a drag.
+    // Emitted when a button was tapped, without a drag.
     void itemPressed(QPushButton* button);
 
 protected:
@@ -56,7 +56,7 @@ private:
 
     OneFinger mFinger{this};
     Flicker mFlicker{this, FlickMotion::templateGrid()}; // in coordinates of this widget
-    QPoint mPressPoint;                                  // global
+    QPoint mPressPoint;                                  // global coordinates
     bool mMoved = false;
     QPointer<QPushButton> mPressedButton;
 };

@@ -99,7 +99,7 @@ void TemplateTab::removeTemplate(int id)
     mScrollArea->letGoOf(removed);
     mGrid->removeWidget(removed);
     mItems.removeAt(id);
-    // The call may come from within the item's own event.
+    // Hidden now and deleted later, since this may be called from the item's own event.
     removed->hide();
     removed->setEnabled(false);
     removed->deleteLater();
@@ -160,7 +160,7 @@ void TemplateTab::saveSelection()
         mSource.saveSelectedTemplate(archive->getPath());
 }
 
-// The bar learns of new rows only with the next layout.
+// The range of the scroll bar includes new rows only after the next layout.
 void TemplateTab::scrollToEnd()
 {
     QScrollBar* bar = mScrollArea->verticalScrollBar();

@@ -1,6 +1,3 @@
-// One tab of the template picker: a grid of thumbnails, of which one may be chosen. Both tabs are this class,
-// fed from different sources. Indices are positions in the list of templates; the grid is filled row by row
-// and stays dense. GUI thread.
 #pragma once
 
 #include <QList>
@@ -18,6 +15,9 @@ class QPushButton;
 class TemplateItem;
 class TemplateScrollArea;
 
+// One tab of the template picker: a grid of thumbnails, one of which may be selected. Both tabs are of this
+// class, with different sources. Indices are positions in the list of templates; the grid is filled row by
+// row without gaps. GUI thread.
 class TemplateTab : public QWidget
 {
     Q_OBJECT
@@ -33,42 +33,42 @@ public:
 
     bool isUser() const { return mIsUser; }
 
-    // Shows these templates instead of the ones before, and chooses the one that the source took last. Takes
-    // the records over; those without a name are no templates and are dropped.
+    // Replaces all templates and selects the one that the source reports as the last one selected. Takes
+    // ownership of the records; those without a name are not templates and are deleted.
     void setTemplates(const QVector<Archive*>& templates);
 
-    // At the end; the record's order becomes the new count. Takes the record over.
+    // Appends a template and sets the record's order to the new count. Takes ownership of the record.
     TemplateItem* addNewTemplateToLast(Archive* archive);
 
-    // Deletes the item and the record, and closes the gap. Others are ignored.
+    // Deletes the item and the record, and closes the gap. Ignores an index out of range.
     void removeTemplate(int id);
 
     int count() const { return static_cast<int>(mArchives.size()); }
-    TemplateItem* item(int id) const; // null outside the list, like the record
+    TemplateItem* item(int id) const; // null for an index out of range; also holds for the record
     Archive* archive(int id) const;
 
-    // The first template of this name; -1 for none.
+    // Returns the index of the first template of this name; -1 for none.
     int findTemplateIdFromName(const QString& name) const;
 
-    // Name of a template: that of its record up to the first "/".
+    // Returns the name of a template: its record's name up to the first "/".
     static QString templateName(const Archive& archive);
 
-    // Chooses the item and remembers it as the one taken last; null chooses nothing and remembers nothing.
+    // Selects the item and stores it as the last one; null clears the selection and stores nothing.
     void select(TemplateItem* item);
     TemplateItem* selectedItem() const { return mSelected; }
-    Archive* selectedArchive() const; // null without a choice; stays owned here
-    // Remembers the chosen template's path again.
+    Archive* selectedArchive() const; // null without a selection; owned by the tab
+    // Stores the path of the selected template again.
     void saveSelection();
 
-    // Scrolls to the last row, now or as soon as the grid has been laid out.
+    // Scrolls to the last row, now or after the grid has been laid out.
     void scrollToEnd();
     TemplateScrollArea* scrollArea() const { return mScrollArea; }
 
 Q_SIGNALS:
-    // A finger or the mouse has chosen an item.
+    // Emitted when an item was selected by touch or mouse.
     void itemSelected(int index, TemplateItem* item);
     void itemPressed(QPushButton* button);
-    // Another template is chosen now, or none.
+    // Emitted when the selection has changed or was cleared.
     void selectionChanged();
 
 private Q_SLOTS:
@@ -82,9 +82,9 @@ private:
     ITemplateSource& mSource;
     bool mIsUser;
     TemplateScrollArea* mScrollArea;
-    QWidget* mBoard; // holds the items
+    QWidget* mBoard; // parent of the items
     QGridLayout* mGrid;
     std::vector<std::unique_ptr<Archive>> mArchives;
-    QList<TemplateItem*> mItems; // of the same indices; owned by the board
+    QList<TemplateItem*> mItems; // same indices as the templates; owned by the board
     TemplateItem* mSelected = nullptr;
 };

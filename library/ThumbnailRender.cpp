@@ -28,13 +28,13 @@ const QColor ThumbnailRender::DROP_SHADOW_COLOR(0, 0, 0, 255);
 namespace
 {
 
-// From positions on the 1280 canvas to the 1920 raster: by way of the 3840 one and back by half.
+// Positions are converted from the 1280 canvas to the 1920 raster: times three to 3840, then half of it.
 const double TO_DOUBLE_RASTER = 3.0;
 const double TO_RASTER = 0.5;
 const double CANVAS_RATIO = 2.0 / 3.0;
 const double RASTER_RATIO = 1.0;
 
-// Frames are cut to the raster, so that a text far outside costs nothing to paint.
+// Limits the bounding rectangles to the raster, so that a text far outside it takes no time to paint.
 void limitTextsToRaster(const QGraphicsScene& scene)
 {
     for (QGraphicsItem* item : scene.items()) {
@@ -45,7 +45,7 @@ void limitTextsToRaster(const QGraphicsScene& scene)
 
 void logBoundingRect(const GraphicsText& text, int id)
 {
-    // A damaged file may tell places that no integer holds.
+    // The position in a damaged file may not fit into an integer.
     const QRectF rect = text.sceneBoundingRect();
     LOG_DEBUG_OPERATE(L"ThumbnailRender", 200,
                       QStringLiteral("text %1 boundingRect %2,%3 %4x%5")
@@ -73,14 +73,14 @@ ThumbnailRender::ThumbnailRender(QObject* parent) : IThumbnailRender(parent)
 {
     mMiddleScene.setSceneRect(SCENE_RECT_SIZE);
     mBigScene.setSceneRect(BIG_SIZE_SCENE_RECT_SIZE);
-    // Filled, rendered once and emptied: an index would never pay.
+    // Each scene is filled, rendered once and cleared, so an index would not pay off.
     mMiddleScene.setItemIndexMethod(QGraphicsScene::NoIndex);
     mBigScene.setItemIndexMethod(QGraphicsScene::NoIndex);
 }
 
 ThumbnailRender::~ThumbnailRender()
 {
-    mBigPictures.clear(); // waits for their decoders
+    mBigPictures.clear(); // each job waits for its decoder
     clearMiddleSizeCanvasScene();
     clearBigSizeCanvasScene();
 }
@@ -190,12 +190,13 @@ void ThumbnailRender::makeBigSizeThumbnail(const Archive& archive)
     mBigPictures.push_back(std::move(job));
 }
 
-// A background of 1920x1080 takes as long to decode as the texts take to draw, or longer.
+// Draws the next picture whose background is decoded. Decoding 1920x1080 takes at least as long as drawing
+// the texts, so it is done in another thread.
 void ThumbnailRender::drawDecodedBigPictures()
 {
     if (!mBigPictures.empty() && mBigPictures.front()->isDecoded)
         drawNextBigPicture();
-    // One a turn of the event loop.
+    // Draws only one picture per event.
     if (!mBigPictures.empty() && mBigPictures.front()->isDecoded)
         QMetaObject::invokeMethod(this, &ThumbnailRender::drawDecodedBigPictures, Qt::QueuedConnection);
 }
@@ -208,7 +209,7 @@ void ThumbnailRender::drawNextBigPicture()
         job->decoder.wait();
     const QFileInfo title(QString::fromStdString(job->archive->getPath()));
     if (job->hadTitle && !title.exists() && title.dir().exists())
-        return; // deleted meanwhile, with its pictures
+        return; // the title was deleted meanwhile
     createBigSizeCanvasSceneUsingArchiveData(*job->archive, job->background);
     saveBigSizeThumnail(*job->archive, renderBigAndMiddleSizeCanvasScene());
     clearBigSizeCanvasScene();

@@ -1,8 +1,3 @@
-// Lays out a title in off-screen scenes and renders its pictures.
-//
-// The fast stage gives the list a fresh small picture at once and touches no disk. The slow stage renders the
-// 1920x1080 picture and hands it to a thread that writes all four files; it runs when the title is left.
-// GUI thread only; the files are written by the PictureThread.
 #pragma once
 
 #include "canvas/IThumbnailRender.h"
@@ -23,6 +18,11 @@ class Archive;
 class GraphicsPixmap;
 class GraphicsText;
 
+// Lays out a title in off-screen scenes and renders its pictures.
+//
+// The fast stage renders a small picture for the list at once, without writing files. The slow stage renders
+// the 1920x1080 picture and passes it to a thread that writes all four files; it is used when another title
+// is shown. GUI thread only; the files are written by the PictureThread.
 class ThumbnailRender : public IThumbnailRender
 {
     Q_OBJECT
@@ -38,20 +38,20 @@ public:
     static const QColor DROP_SHADOW_COLOR;
 
     explicit ThumbnailRender(QObject* parent = nullptr);
-    // Pictures that are queued but not begun are not written any more.
+    // Drops pictures that are queued and not begun.
     ~ThumbnailRender() override;
 
-    // False: the fast stage, which ends in saveHalfThumbnailsOK. True: the slow stage, which queues the
-    // files: the background is decoded by another thread, and the picture drawn in a later turn of the event
-    // loop. Null does nothing. The record is only read.
+    // Makes the pictures of the title. With false runs the fast stage, which emits saveHalfThumbnailsOK().
+    // With true runs the slow stage, which queues the files: another thread decodes the background, and the
+    // picture is drawn in a later turn of the event loop. Null does nothing. The record is not changed.
     void makeThumbnail(const Archive* archive, bool bigSize) override;
-    // True when every queued picture has been written. What is still to be drawn is drawn first, so that
-    // callers may wait without an event loop.
+    // Returns whether every queued picture is written. Draws the pictures that are still to be drawn first,
+    // so that callers can wait without an event loop.
     bool makePictureThreadIsFinished() override;
     int unfinishedTitles() override;
     void folderRenamed(const QString& before, const QString& after) override;
 
-    // Hooks for what a subclass may keep beside the scenes.
+    // Called before the scenes are cleared. For subclasses with resources of their own.
     virtual void clearBigSizeCanvasSceneResource();
     virtual void clearMiddleSizeCanvasSceneResource();
 
@@ -69,20 +69,20 @@ private:
     void clearMiddleSizeCanvasScene();
     void clearBigSizeCanvasScene();
 
-    // A title whose big picture is to be drawn once its background is decoded.
+    // A title whose big picture is drawn after its background has been decoded.
     struct BigPicture {
         std::unique_ptr<Archive> archive;
-        bool hadTitle = false; // whether there was a title file when the job was queued
+        bool hadTitle = false; // whether the title file existed when the job was queued
         QImage background;
-        std::atomic<bool> isDecoded = false; // the background may be used
+        std::atomic<bool> isDecoded = false; // whether background is set
         std::future<void> decoder;
     };
 
     std::deque<std::unique_ptr<BigPicture>> mBigPictures;
-    QList<GraphicsText*> mTexts; // of the last fast layout, owned by its scene
+    QList<GraphicsText*> mTexts; // of the last fast layout; owned by mMiddleScene
     QGraphicsScene mMiddleScene;
     QGraphicsScene mBigScene;
-    GraphicsPixmap* mMiddleBackground = nullptr; // owned by its scene
-    GraphicsPixmap* mBigBackground = nullptr;    // owned by its scene
-    PictureThread mPictureThread;                // last: ends before the scenes go
+    GraphicsPixmap* mMiddleBackground = nullptr; // owned by mMiddleScene
+    GraphicsPixmap* mBigBackground = nullptr;    // owned by mBigScene
+    PictureThread mPictureThread;                // last, so that it is destroyed before the scenes
 };

@@ -10,7 +10,7 @@
 class Archive;
 
 // The title that the operator has copied: its record and its pictures, so that it can be pasted after its
-// source is gone. GUI thread.
+// source was deleted. GUI thread.
 class TitleClipboard
 {
 public:
@@ -19,13 +19,13 @@ public:
     TitleClipboard& operator=(const TitleClipboard&) = delete;
 
     bool isEmpty() const { return !m_archive; }
-    // Takes a copy in place of the one before. Begins to decode its background on another core, so that the
-    // canvas need not do that when it is pasted.
+    // Replaces the copy. Starts decoding its background in another thread, so that the canvas finds it
+    // decoded when the title is pasted.
     void copy(const Archive& archive);
     void clear();
 
-    // Writes the copy as a new title of the folder. Null when there is no copy, or as
-    // TitleFileOperations::createFromCopy.
+    // Writes the copy as a new title of the folder. Returns null without a copy, and when
+    // TitleFileOperations::createFromCopy() does.
     std::unique_ptr<Archive> paste(const TitleFileOperations& files, const QString& folder);
 
 private:
@@ -34,5 +34,5 @@ private:
     std::unique_ptr<Archive> m_archive;
     TitlePictures m_pictures;
     std::future<BackgroundPicture::Decoded> m_decoder;
-    std::shared_ptr<const BackgroundPicture> m_background; // kept, so that it is found decoded
+    std::shared_ptr<const BackgroundPicture> m_background; // kept, so that the canvas can share it
 };

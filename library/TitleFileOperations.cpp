@@ -27,7 +27,7 @@ const QString TitleFileOperations::TEMPLATE_STEM = QStringLiteral("Titler");
 namespace
 {
 
-// No picture of a title comes near this; what is larger is not one of ours.
+// No picture of a title has nearly this size; larger files were not made by this program.
 constexpr std::size_t PICTURE_LIMIT = 64 * 1024 * 1024;
 
 QByteArray readPicture(const QString& path)
@@ -38,7 +38,7 @@ QByteArray readPicture(const QString& path)
     return QByteArray::fromStdString(bytes);
 }
 
-// Empty for a name that leads to where no titles and templates are.
+// Returns an empty path for a name that leads outside the folders of titles and templates.
 QString pictureOf(const Archive& archive, const std::string& name)
 {
     if (name.empty())
@@ -64,7 +64,7 @@ void writePictures(const Archive& archive, const TitlePictures& pictures)
     writePicture(archive, archive.getThumbnailBlack(), pictures.black);
 }
 
-// From the last "." on; empty when there is none.
+// Returns the part from the last "." on; empty when there is none.
 QString extensionOf(const std::string& fileName)
 {
     const QString name = QString::fromStdString(fileName);
@@ -72,15 +72,15 @@ QString extensionOf(const std::string& fileName)
     return dot < 0 || dot < name.lastIndexOf(QLatin1Char('/')) ? QString() : name.mid(dot);
 }
 
-// A background that gets names of its own with each copy. Without them it would be copied over files that may
-// be another title's.
+// Returns whether the background is copied under names of its own. Without these it would be copied over
+// files that may belong to another title.
 bool hasOwnBackground(const Archive& archive)
 {
     return !archive.isPreset() && !extensionOf(archive.getThumbnailSmall()).isEmpty();
 }
 
-// Removes what was made for a title that could not be made as a whole: the pictures whose names begin with
-// its stem, and no others.
+// Removes the files of a title that could not be created completely: the pictures whose names begin with its
+// stem.
 void removeFiles(const Archive& archive, const std::string& stem)
 {
     for (const std::string& name :
@@ -166,7 +166,7 @@ std::unique_ptr<Archive> TitleFileOperations::createFromCopy(const QString& fold
         return nullptr;
     auto archive = std::make_unique<Archive>(copy);
     renameRecord(*archive, folder);
-    // A photograph's files are several megabytes each; another core takes half of them.
+    // The files of a photograph have several megabytes each, so half of them are written in another thread.
     const std::future<void> written =
         std::async(std::launch::async, [&] { writePictures(*archive, pictures); });
     bool isCopied = true;
@@ -190,8 +190,8 @@ std::unique_ptr<Archive> TitleFileOperations::createUserTemplate(const QString& 
     const QString folder = root + QLatin1Char('/') + name;
     if (!SystemInfo::createFolders(folder.toStdWString())) {
         LOG_EVENT(L"ArchiveList", __LINE__, L"ERROR create dir.", 4);
-        // The folder of a template that was deleted is taken again. A template that is there stays, whatever
-        // the caller could read of the order.
+        // The folder of a deleted template is used again. If it contains a template, that is kept, even if
+        // the order file does not list it.
         if (!QFileInfo(folder).isDir() ||
             QFileInfo::exists(folder + QLatin1Char('/') + TEMPLATE_STEM + XML_EXTENSION))
             return nullptr;
@@ -207,7 +207,7 @@ std::unique_ptr<Archive> TitleFileOperations::createUserTemplate(const QString& 
     } else {
         target->setThumbnailSmall((TEMPLATE_STEM + THUMBNAIL_SOURCE + extension).toStdString());
         writePicture(*target, target->getThumbnailSmall(), readPicture(source.getFullPathOfThumbnailSmall()));
-        // The background becomes the template's own, also where it was that of a preset.
+        // The template gets a background of its own, even if the source has that of a preset.
         if (!source.getBgResource().empty())
             target->setBgResource((TEMPLATE_STEM + BG_SOURCE + extension).toStdString());
         if (!source.getBgResourceBig().empty())
@@ -217,7 +217,7 @@ std::unique_ptr<Archive> TitleFileOperations::createUserTemplate(const QString& 
     }
     if (!isCopied || !mController.saveNewArchive(root, target.get())) {
         removeFiles(*target, TEMPLATE_STEM.toStdString());
-        QDir().rmdir(folder); // if nothing else is in it
+        QDir().rmdir(folder); // removes it only if it is empty
         return nullptr;
     }
     return target;

@@ -1,5 +1,3 @@
-// Makes the files of a new title in a folder, from a template or from a copy held in memory, and those of a
-// user template. Has no widgets. GUI thread; nothing here waits for the disk to have written.
 #pragma once
 
 #include <QByteArray>
@@ -10,7 +8,7 @@
 class Archive;
 class ArchiveController;
 
-// The pictures of a copied title as the bytes of their files, so that the copy survives its source.
+// The pictures of a copied title as the bytes of their files, which remain when the source is deleted.
 struct TitlePictures {
     QByteArray big;
     QByteArray middle;
@@ -18,6 +16,8 @@ struct TitlePictures {
     QByteArray small;
 };
 
+// Makes the files of a new title in a folder, from a template or from a copy held in memory, and the files of
+// a user template. Has no widgets. GUI thread; nothing here waits until the disk has synced.
 class TitleFileOperations
 {
 public:
@@ -30,30 +30,31 @@ public:
     static const QString BG_SOURCE;
     static const QString BG_SOURCE_BIG;
     static const QString XML_EXTENSION;
-    static const QString TEMPLATE_STEM; // of the files of a user template
+    static const QString TEMPLATE_STEM; // stem of the file names of a user template
 
     // The controller is not owned and must outlive this object.
     explicit TitleFileOperations(ArchiveController& controller);
 
-    // A stem that no title of the folder has: the time of creation, moved on by milliseconds when taken.
+    // Returns a stem that no title of the folder has: the time of creation, increased by milliseconds while
+    // it is in use.
     static QString freeStem(const QString& folder, const QDateTime& now = QDateTime::currentDateTime());
 
-    // Copies the template's pictures under new names and writes the title file. Null when the folder is empty
-    // or the disk refuses the title file or its background; then nothing of it is left. A picture that is
-    // refused is made when the title is opened.
+    // Copies the template's pictures under new names and writes the title file. Returns null, and leaves no
+    // files, when the folder is empty or the title file or its background cannot be written. Other pictures
+    // that cannot be written are made when the title is opened.
     std::unique_ptr<Archive> createFromTemplate(const QString& folder, const Archive& source) const;
 
-    // What createFromCopy needs besides the record; unreadable pictures stay empty.
+    // Loads the pictures for createFromCopy(); unreadable ones stay empty.
     static TitlePictures loadPictures(const Archive& archive);
 
-    // Writes the held pictures under new names, copies the background files while they still exist and writes
-    // the title file. Null as above.
+    // Writes the held pictures under new names, copies the background files if they still exist and writes
+    // the title file. Returns null as createFromTemplate() does.
     std::unique_ptr<Archive> createFromCopy(const QString& folder, const Archive& copy,
                                             const TitlePictures& pictures) const;
 
-    // Makes the folder of a user template of this name in the root and in it the title file, with copies of
-    // the small picture and the background. The record's name is "<name>/Titler". Null as above, or when
-    // there is no folder for it.
+    // Creates the folder of a user template of this name in the root, with the title file and copies of the
+    // small picture and the background. The record's name is "<name>/Titler". Returns null as
+    // createFromTemplate() does, or when the folder cannot be created.
     std::unique_ptr<Archive> createUserTemplate(const QString& root, const QString& name,
                                                 const Archive& source) const;
 

@@ -73,7 +73,7 @@ void TitleMenuActions::showOptionMenu(ArchiveItem* item, const QPoint& pos, QWid
     m_menu->enableFor(item != nullptr, !m_clipboard.isEmpty());
     m_menu->setFont(m_menuFont);
 
-    // In the lower part of the list the menu opens upwards, so that it stays on the screen.
+    // In the lower part of the list the menu opens upwards, so that it fits on the screen.
     const QPoint anchor = item ? item->mapToGlobal(pos) : area->mapToGlobal(pos);
     const QRect upper(QPoint(0, 0), QPoint(m_list->width(), 4 * (m_list->height() / 7) - 1));
     m_menu->setBalloonAlignment(upper.contains(m_list->mapFromGlobal(anchor)) ? MenuPlacement::Below
@@ -103,7 +103,7 @@ bool TitleMenuActions::isMenuShowing() const
 void TitleMenuActions::hideMenu()
 {
     if (isMenuShowing())
-        m_menu->close(); // and with it menuAboutToClose
+        m_menu->close(); // also emits menuAboutToClose()
 }
 
 void TitleMenuActions::translateText()
@@ -162,14 +162,14 @@ void TitleMenuActions::createArchiveFromTemplate(Archive* temp)
 {
     if (!temp)
         return;
-    // The picker also opens over a full list, to show the template that has just been saved.
+    // The picker can also be opened while the list is full, to show the template that was just saved.
     if (m_list->checkArchiveListIsFull()) {
         ListMessages::post(MessageDef::MESSAGE_LIST_FULL_ON_CREATE, ListMessages::limitText());
         return;
     }
     std::unique_ptr<Archive> archive = m_files.createFromTemplate(m_list->getCurrentPath(), *temp);
     if (!archive) {
-        if (!m_list->getCurrentPath().isEmpty()) // the disk refused
+        if (!m_list->getCurrentPath().isEmpty()) // the disk refused the files
             ListMessages::post(MessageDef::MESSAGE_DISK_FULL_ON_CREATE, ArchiveList::tr("File"));
         return;
     }
@@ -192,7 +192,7 @@ void TitleMenuActions::exeCopyArchive()
     if (!item || !item->getArchiveData())
         return;
     m_clipboard.copy(*item->getArchiveData());
-    m_list->setOperationItemState(item); // the border stays on
+    m_list->setOperationItemState(item); // the border stays
 }
 
 void TitleMenuActions::exePasteArchive()
@@ -225,7 +225,7 @@ void TitleMenuActions::exeDeleteArchive()
         return;
     m_list->clearOperationItemState(item);
     m_list->finishCheck();
-    // The check may have found that the title is gone.
+    // The check may have removed the title.
     item = m_list->getCurrentOperationArchive();
     const int position = m_list->getItemIndex(item);
     if (position < 0)
@@ -243,8 +243,8 @@ void TitleMenuActions::exeAddUserArchive()
     const QString root = QString::fromStdWString(FolderLookup::wide(&IPathManagerEx::getTitlerTemplatesPath));
     const QString name = m_controller.getFreeNameInUserTemplate(root);
     const auto templates = static_cast<int>(m_controller.getFileOrder(root).size());
-    // Without a free name, which can be so from 998 rows on, the template would become a file among the
-    // folders.
+    // Without a free name the template would be saved in the root folder itself. There may be none from 998
+    // rows on.
     if (templates > ListMessages::TEMPLATE_LIMIT || name.isEmpty()) {
         ListMessages::post(MessageDef::MESSAGE_TEMPLATE_LIST_FULL, name);
         return;

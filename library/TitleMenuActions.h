@@ -20,39 +20,39 @@ class QAction;
 class QPoint;
 class QUndoCommand;
 
-// The option menu of the title list and what its entries do: create, copy, paste and delete titles, and save
-// them as templates. Every change of the list goes out as an undo command. GUI thread.
+// The option menu of the title list and its actions: create, copy, paste and delete titles, and save them as
+// templates. Every change of the list is emitted as an undo command. GUI thread.
 class TitleMenuActions : public QObject
 {
     Q_OBJECT
 
 public:
-    // Neither is owned, and both outlive this object.
+    // Neither is owned, and both must outlive this object.
     TitleMenuActions(ArchiveList* list, ArchiveController& controller);
     ~TitleMenuActions() override;
 
-    // Opens the menu for a title, or with null for the empty area behind the last one. pos lies in the item,
-    // or in the area.
+    // Opens the menu for a title, or with null for the empty area after the last one. pos is in coordinates
+    // of the item or of the area.
     void showOptionMenu(ArchiveItem* item, const QPoint& pos, QWidget* area);
     bool isMenuShowing() const;
     void hideMenu();
-    // Reports to the siblings whether a popup is open: a press in one of them closes it.
+    // Reports to the sibling processes whether a popup is open: a press in one of them closes it.
     void sendTitlerAppEvent(bool open);
     void setMenuFont(const QFont& font) { m_menuFont = font; }
     void translateText();
 
     void selectOptionMenuItem(QAction* action);
-    // As ArchiveList::createArchiveFromTemplate.
+    // See ArchiveList::createArchiveFromTemplate().
     void createArchiveFromTemplate(Archive* temp);
     void clearCopyArchive() { m_clipboard.clear(); }
 
-    // The row behind which titles are created and pasted; -1 for none.
+    // Sets the row after which titles are created and pasted; -1 for none.
     void setOperationPosition(int position) { m_operationPosition = position; }
-    // The rows, in their order, have left the list.
+    // Call when rows, in ascending order, were removed from the list.
     void rowsRemoved(const QList<int>& rows);
 
 Q_SIGNALS:
-    // As the signals of the list.
+    // See the signals of ArchiveList.
     void deleteCommandSignal(QUndoCommand* command);
     void pasteCommandSignal(QUndoCommand* command);
     void addUserSignal(QString name);
@@ -75,7 +75,7 @@ private:
     ArchiveController& m_controller;
     TitleFileOperations m_files;
     TitleClipboard m_clipboard;
-    std::unique_ptr<ArchiveMenu> m_menu; // made at first use, a child of the list
+    std::unique_ptr<ArchiveMenu> m_menu; // made at first use; a child of the list
     QFont m_menuFont;
     QPointer<ITitlerAPPEventFilterController> m_eventController;
     int m_operationPosition = -1;

@@ -58,7 +58,7 @@ void TitlePreview::initThumbnailArea(const QString& picture)
 
 void TitlePreview::updateThumbnailArea(const QString& title)
 {
-    // A title with a background of its own has a small picture of that one's kind.
+    // The small picture of a title with a background of its own has the file type of the background.
     Archive archive;
     if (ArchiveController().getOneArchive(title, &archive) && !archive.getThumbnailSmall().empty()) {
         initThumbnailArea(archive.getFullPathOfThumbnailSmall());

@@ -8,17 +8,17 @@ class QLabel;
 class QPoint;
 class QWidget;
 
-// The small picture of the title that is pressed in the folder picker, and the size of titles below it.
-// GUI thread.
+// The small picture of the title that is pressed in the folder picker, with the size of titles below it. GUI
+// thread.
 class TitlePreview
 {
 public:
-    // Shows nothing at first. The parent owns the labels and outlives this object; place is in its
+    // Shows nothing at first. The parent owns the labels and must outlive this object; place is in its
     // coordinates.
     TitlePreview(QWidget* parent, const QPoint& place);
 
     void setFont(const QFont& font);
-    // Shows the picture that the title file names, or else the one beside it. Full path.
+    // Shows the picture named in the title file, or otherwise the one named after it. Full path.
     void updateThumbnailArea(const QString& title);
     void clearThumbnailArea();
 

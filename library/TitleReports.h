@@ -1,11 +1,11 @@
-// Where the list's undo commands report titles that come and go: the file manager by full path, and the
-// request at hand by plain file name. Whatever is not installed is left out. GUI thread.
 #pragma once
 
 #include "messaging/services/FileManagerDefine.h"
 
 #include <QString>
 
+// Reports titles added or removed by the list's undo commands: to the file manager by full path, and to the
+// current request by plain file name. A receiver that is not installed is skipped. GUI thread.
 namespace TitleReports
 {
 

@@ -12,7 +12,7 @@
 namespace
 {
 
-// Titles that are read before the list shows: as many as an operator can make.
+// Number of titles that are read before the list is shown: as many as an operator can create.
 constexpr std::size_t AT_ONCE = ListMessages::TITLE_LIMIT;
 
 } // namespace

@@ -11,8 +11,8 @@ class ArchiveCheckThread;
 class ArchiveList;
 class ScrollViewerRow;
 
-// Makes the rows of a folder for the title list. Which of its files are titles depends on what they hold:
-// those of a long folder are checked by and by in a thread. GUI thread.
+// Makes the rows of a folder for the title list. Whether a file is a title depends on its contents: the files
+// of a long folder are checked gradually in a thread. GUI thread.
 class TitleRows : public QObject
 {
     Q_OBJECT
@@ -21,17 +21,17 @@ public:
     TitleRows();
     ~TitleRows() override;
 
-    // Reads the folder in its order. At least one row is known to be a title, if there is any. The check of
-    // the others waits for beginCheck(); a check of the folder before is given up.
+    // Reads the folder in its order. Checks files until at least one title is found, if there is any.
+    // beginCheck() starts the check of the others; a running check of the previous folder is ended.
     std::vector<std::unique_ptr<ScrollViewerRow>> read(ArchiveList& list, const QString& folder);
-    // Returns how many rows are known to be titles.
+    // Returns how many rows were found to be titles when the folder was read.
     int readAtOnce() const { return m_readAtOnce; }
 
     bool isChecking() const { return m_check != nullptr; }
     void beginCheck();
     // Blocks until all files are checked.
     void waitForCheck();
-    // Returns the numbers of the files that have turned out to be no titles since the last call.
+    // Returns the numbers of the files found not to be titles since the last call.
     QSet<std::size_t> takeUnreadable();
     void endCheck();
 
@@ -39,6 +39,6 @@ Q_SIGNALS:
     void unreadableFound();
 
 private:
-    std::unique_ptr<ArchiveCheckThread> m_check; // while places of titles are not final
+    std::unique_ptr<ArchiveCheckThread> m_check; // exists while rows may still be removed
     int m_readAtOnce = 0;
 };

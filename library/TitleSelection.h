@@ -4,18 +4,19 @@
 
 class ArchiveItem;
 
-// Which items of the title list are marked, and their looks: the selected one is the title on the canvas, the
-// operation item is the one that the menu or a drag acts on, shown by a border. Items may be destroyed
-// meanwhile. GUI thread.
+// Keeps which items of the title list are marked, and sets their looks: the selected one is the title on the
+// canvas; the operation item, shown by a border, is the one that the menu or a drag acts on. Items may be
+// destroyed meanwhile. GUI thread.
 class TitleSelection
 {
 public:
     ArchiveItem* selected() const;
     ArchiveItem* operation() const;
 
-    // Null is ignored by all of these. The looks of the item that was marked before are the caller's matter.
+    // Change which item is marked, or its look; null is ignored. The caller has to reset the look of the item
+    // that was marked before.
     void select(ArchiveItem* item);
-    // Gives the item the looks of the selected one, without a border.
+    // Gives the item the look of the selected one, without a border.
     static void showSelected(ArchiveItem* item);
     static void showDefault(ArchiveItem* item);
     void mark(ArchiveItem* item);

@@ -8,7 +8,7 @@
 namespace
 {
 
-const int LIST_PANE = 8; // kind of frame
+const int LIST_PANE = 8; // kind, see DrawBoundingRectangle
 const int TAB_OVERLAP = 4;
 constexpr QColor DIALOG_COLOR(51, 51, 51);
 

@@ -1,10 +1,10 @@
-// The tabs of a picker, with the frame of a list pane drawn in their page.
 #pragma once
 
 #include "touchui/KSTabWidget.h"
 
 #include <QPixmap>
 
+// The tab widget of a picker, which draws the frame of a list pane in its page.
 class TitlerTabWidget : public KSTabWidget
 {
     Q_OBJECT
@@ -12,7 +12,7 @@ class TitlerTabWidget : public KSTabWidget
 public:
     explicit TitlerTabWidget(QWidget* parent = nullptr);
 
-    // Makes the frame of a list pane and draws it with its corner at this point of the widget.
+    // Creates the frame of a list pane and sets its top left corner, in coordinates of the widget.
     void setPainLine(int x, int y);
 
 protected:

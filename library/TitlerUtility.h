@@ -1,16 +1,16 @@
-// Names and paths of the pictures that lie beside a title file. Thread-safe.
 #pragma once
 
 #include <string>
 
+// Names and paths of the pictures in the folder of a title file. Thread-safe.
 class TitlerUtility
 {
 public:
-    // "/a/b/title.xml" and "_960.png" give "title_960.png".
+    // For "/a/b/title.xml" and "_960.png" returns "title_960.png".
     static std::string getThumbnailNameFromTitlePath(std::string title, std::string suffix);
-    // "/a/b/title.xml" and "x.png" give "/a/b/x.png".
+    // For "/a/b/title.xml" and "x.png" returns "/a/b/x.png".
     static std::string getThumbnailPathFromTitlePath(std::string title, std::string name);
-    // The same for a name that a title file gives and at whose place something is written or removed: empty
-    // for one that is no picture's, see ArchiveManager::isPictureName.
+    // Returns the path for a picture that is written or removed. Empty for a name in a title file that is not
+    // a valid picture name, see ArchiveManager::isPictureName().
     static std::string getPicturePathFromTitlePath(std::string title, std::string name);
 };

@@ -1,4 +1,3 @@
-// Opens the picker of a title list from outside the GUI thread, once. Takes no part in the undo stack.
 #pragma once
 
 #include <QMutex>
@@ -6,6 +5,7 @@
 
 class ArchiveList;
 
+// Opens the picker of a title list once, from outside the GUI thread. Not related to the undo stack.
 class UndoThread : public QThread
 {
     Q_OBJECT

@@ -1,4 +1,3 @@
-// The option menu of a user template.
 #pragma once
 
 #include "library/ArchiveAction.h"
@@ -6,6 +5,7 @@
 
 #include <QList>
 
+// The option menu of a user template.
 class UserTemplateMenu : public KSMenu
 {
     Q_OBJECT
@@ -13,7 +13,7 @@ class UserTemplateMenu : public KSMenu
 public:
     explicit UserTemplateMenu(QWidget* parent = nullptr);
 
-    // Sets the texts again after a change of language.
+    // Updates the texts after a change of language.
     void translateText();
     ArchiveAction* action(ArchiveAction::ARCHIVE_ACTION_TYPE type) const;
 

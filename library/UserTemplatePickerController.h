@@ -1,5 +1,3 @@
-// Feeds the tab of the operator's own templates, and tells the file manager of those that are deleted there.
-// Names are those of template folders. GUI thread.
 #pragma once
 
 #include "library/ITemplateSource.h"
@@ -9,15 +7,17 @@
 
 class Archive;
 
+// The source of the user templates; reports those that are deleted in the picker to the file manager. Names
+// are those of template folders. GUI thread.
 class UserTemplatePickerController : public ITemplateSource
 {
 public:
-    // The caller owns the records.
+    // Returns the user templates; the caller owns the records.
     QVector<Archive*> getTemplates();
     std::string getLastSelectedTemplate() override;
     void saveSelectedTemplate(std::string path) override;
 
-    // See UserTemplateManager for these.
+    // Forward to UserTemplateManager.
     int loadTemplate(std::string name, Archive* archive);
     int addNewTemplateToLastInOrderXml(std::string name);
     int removeFromOrderXml(std::string name);
@@ -26,6 +26,7 @@ public:
     int reCreateNewOrderXml();
     bool isTemplatePath(const QString& path) const;
 
-    // Deletes the template with this title file and reports it. 0 when the title file stayed.
+    // Deletes the template with this title file and reports it. Returns 0 when the title file could not be
+    // deleted.
     int deleteTemplate(std::string path);
 };

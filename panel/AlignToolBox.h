@@ -26,7 +26,7 @@ public:
 
     explicit AlignToolBox(QWidget* parent);
 
-    // -1 left, 0 centre, 1 right; any other value selects none. Shown once the box is enabled.
+    // Sets -1 left, 0 centre or 1 right; any other value selects none. Shown once the box is enabled.
     void setAlign(int align) { m_align = align; }
     int getAlign() const { return m_align; }
 

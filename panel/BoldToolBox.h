@@ -2,7 +2,7 @@
 
 #include "panel/ToolBox.h"
 
-// Bold on or off, and the label of the row that it shares with ItalicToolBox.
+// Switches bold on or off; also holds the label of the row that it shares with ItalicToolBox.
 class BoldToolBox : public ToolBox
 {
     Q_OBJECT
@@ -18,7 +18,7 @@ public:
 
     explicit BoldToolBox(QWidget* parent);
 
-    // 0 or 1; anything else shows off.
+    // Shows 0 off or 1 on; any other value counts as off.
     void setFontBold(int bold);
     int getFontBold() const { return m_bold; }
 

@@ -26,7 +26,7 @@ QString ColorButton::getRgbaValue(const QString& color)
         .arg(value.alpha());
 }
 
-// Parsing a style sheet costs, and the same colour is set again and again.
+// Skips a style sheet that is set already, since parsing it is slow.
 void ColorButton::setFace(const QString& color, const QString& declarations)
 {
     const QString sheet = QStringLiteral("background-color:%1; %2").arg(color, declarations);

@@ -5,7 +5,7 @@
 #include <QColor>
 #include <QString>
 
-// A touch button whose face is a colour: it is painted from its style sheet, darker while it is pressed and
+// A touch button that shows a colour: it is painted from its style sheet, darker while it is pressed and
 // faint while it is disabled.
 class ColorButton : public KSPushbutton
 {
@@ -13,7 +13,8 @@ class ColorButton : public KSPushbutton
 public:
     explicit ColorButton(QWidget* parent);
 
-    // "rgba(<red>, <green>, <blue>, <alpha>)" for a style sheet; a text that is not a colour gives black.
+    // Returns "rgba(<red>, <green>, <blue>, <alpha>)" for a style sheet; black for a text that is not a
+    // colour.
     static QString getRgbaValue(const QString& color);
 
     // Sets "background-color" to the colour and adds the rest of the declarations.

@@ -30,7 +30,7 @@ constexpr int GRID_TOP = 56;
 constexpr int ANSWERS_TOP = 275;
 constexpr int ANSWER_SPACING = 20;
 constexpr QColor FOCUS_COLOR(0, 129, 255);
-constexpr QColor CORNER_COLOR(30, 30, 30); // beside the round corners of the frame
+constexpr QColor CORNER_COLOR(30, 30, 30); // outside the round corners of the frame
 constexpr int FOCUS_MARGIN = 3;
 
 const char REST_STYLE[] = "border: 1px solid white; width:53px; height:48px;border-radius:2px;";
@@ -44,7 +44,7 @@ ColorPalette::ColorPalette(QWidget* parent) : QDialog(parent, Qt::Dialog | Qt::F
     setFixedSize(PALETTE_WIDTH, PALETTE_HEIGHT);
     setAttribute(Qt::WA_AcceptTouchEvents);
     connect(&m_finger, &OneFinger::cancelled, this, &ColorPalette::putBack);
-    new WindowPlaceKeeper(this); // child of this
+    new WindowPlaceKeeper(this); // owned by this widget
     initColorValueList();
     createButtons();
     createLayout();
@@ -90,7 +90,8 @@ void ColorPalette::createLayout()
 {
     m_title = new QLabel(this);
     m_title->setStyleSheet(PALETTE_LABEL_STYLE);
-    m_title->setAttribute(Qt::WA_TransparentForMouseEvents); // the palette is moved by it, too
+    // The palette can also be dragged by its title.
+    m_title->setAttribute(Qt::WA_TransparentForMouseEvents);
     m_title->setGeometry(TITLE_LEFT, TITLE_TOP, PALETTE_LABEL_WIDTH, PALETTE_LABEL_HEIGHT);
 
     auto* grid = new QGridLayout;
@@ -241,7 +242,7 @@ void ColorPalette::drawFocusBoundingRect(QPainter& painter) const
 
 // Moving
 
-// A finger on the palette drags like a mouse; its buttons look after their own touches.
+// Handles a finger on the palette like a mouse; the buttons handle their own touches.
 bool ColorPalette::event(QEvent* event)
 {
     switch (event->type()) {

@@ -16,9 +16,9 @@ class QLabel;
 class QPainter;
 class QTouchEvent;
 
-// Thirty colours to choose from, for the text and for its edge. A tap on a colour is previewed at once; OK
-// keeps it, Cancel brings back what was there when the palette opened. A finger on the palette itself moves
-// it within the titler's window. Not modal. GUI thread only.
+// A palette of thirty colours, for the text and for its edge. A tap on a colour previews it at once; OK keeps
+// it, Cancel restores the colour from when the palette was opened. Dragging the palette itself moves it
+// within the titler's window. Not modal. GUI thread only.
 class ColorPalette : public QDialog
 {
     Q_OBJECT
@@ -40,24 +40,24 @@ public:
 
     explicit ColorPalette(QWidget* parent);
 
-    // Selects the colour, "#rrggbb", and remembers it for Cancel; one that is not in the table selects
+    // Selects the colour, "#rrggbb", and remembers it for Cancel; a colour that is not in the table selects
     // nothing.
     void setCurrentColor(const QString& color);
     QString currentColor() const { return m_currentColor; }
-    // Index of the selected button, USELESS_VALUE without one.
+    // Returns the index of the selected button, USELESS_VALUE without one.
     int currentIndex() const { return m_currentIndex; }
     const QList<QString>& colors() const { return m_colors; }
 
-    // While a mask shows, the palette takes no touches.
+    // Shows or hides a mask; while it is shown the palette ignores touches.
     void showDialogMask(bool show);
     void showMessageMask(bool show);
 
     void translateText();
 
 public Q_SLOTS:
-    // Global coordinates.
+    // Sets the area in which the palette can be moved, in global coordinates.
     void setTitlerWindowRect(QRect rect) { m_titlerWindowRect = rect; }
-    // Cancel, also by Escape; does nothing while the palette is hidden.
+    // Cancels, also on Escape; does nothing while the palette is hidden.
     void reject() override;
 
 Q_SIGNALS:
@@ -82,7 +82,7 @@ private:
     void setColorValue(int index);
     void okClicked();
     void cancelClicked();
-    // Hides the palette and takes the mask off the soft keyboard.
+    // Hides the palette and removes the mask from the soft keyboard.
     void closePalette();
     void drawFocusBoundingRect(QPainter& painter) const;
     void drawHorizontalLine(QPainter& painter, const QRect& line) const;

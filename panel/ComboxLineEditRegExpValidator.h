@@ -2,8 +2,8 @@
 
 #include <QRegularExpressionValidator>
 
-// Lets only finished values into a field: what could become one by more typing is refused, too, since the
-// soft keyboard collects the typing and sends the whole text.
+// Accepts complete values only: input that more typing could complete is refused as well, since the soft
+// keyboard collects the typing and sends the whole text.
 class ComboxLineEditRegExpValidator : public QRegularExpressionValidator
 {
     Q_OBJECT

@@ -49,11 +49,11 @@ EdgeSizeSlider::~EdgeSizeSlider()
     m_outsidePress->stop();
 }
 
-// The ends of the range stand beside the slider.
+// Creates the slider with the ends of its range as labels on both sides.
 QWidget* EdgeSizeSlider::createContent()
 {
     auto* content = new QWidget;
-    content->setAttribute(Qt::WA_NoMousePropagation); // a press beside the slider chooses nothing
+    content->setAttribute(Qt::WA_NoMousePropagation); // a press beside the slider must not reach the menu
     auto* begin = new QLabel(QString::number(SLIDER_RANGE_BEGIN), content);
     begin->setFixedWidth(BEGIN_LABEL_WIDTH);
     m_endLabel = new QLabel(content);

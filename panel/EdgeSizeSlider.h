@@ -8,8 +8,8 @@ class KSSLider;
 class OutsidePressFilter;
 class QLabel;
 
-// The slider for the width of the edge, in a menu of its own that a press beside it closes. It is no popup of
-// Qt's, which would keep touches from the slider.
+// The slider for the width of the edge, in a menu that is closed by a press outside it. It is not a Qt popup,
+// since a popup would keep touches from the slider.
 class EdgeSizeSlider : public QMenu
 {
     Q_OBJECT
@@ -23,14 +23,14 @@ public:
     explicit EdgeSizeSlider(QWidget* parent);
     ~EdgeSizeSlider() override;
 
-    // Kept within the range; reports nothing.
+    // Sets the value, limited to the range, without a signal.
     void setValue(int value);
     int value() const;
     KSSLider* slider() const { return m_slider; }
     void translateText();
 
 Q_SIGNALS:
-    // The operator moved the slider.
+    // Emitted when the operator has moved the slider.
     void sliderValueSignal(int value);
 
 protected:

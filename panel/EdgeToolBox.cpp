@@ -71,7 +71,7 @@ QString EdgeToolBox::getRgbaValue(const QString& color) const
     return ColorButton::getRgbaValue(color);
 }
 
-// What the operator does
+// Actions of the operator
 
 void EdgeToolBox::onEdgeBtnClicked()
 {
@@ -110,7 +110,7 @@ void EdgeToolBox::edgeWidthChangedForPreview(int value)
     Q_EMIT edgeChange(1, m_edge, TextObjectConstants::PropertyEdgeWidthPreview, PREVIEW, WIDTH);
 }
 
-// The whole drag is one step of undo.
+// Turns the whole drag into one undo step.
 void EdgeToolBox::edgeWidthChangedForSave()
 {
     Q_EMIT signalShowEdgeSlider(false);
@@ -138,7 +138,7 @@ void EdgeToolBox::hideEdgeSliderMenu()
         m_slider->close();
 }
 
-// What is shown
+// Showing values
 
 void EdgeToolBox::setEdge(int on, const TEdge& edge, bool preview)
 {

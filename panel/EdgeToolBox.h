@@ -6,7 +6,7 @@
 class ColorButton;
 class EdgeSizeSlider;
 
-// The edge of the characters: on or off, its width by a slider, its colour by the palette.
+// Sets the edge of the characters: on or off, its width with a slider, its colour with the palette.
 class EdgeToolBox : public ToolBox
 {
     Q_OBJECT
@@ -31,17 +31,17 @@ public:
     static constexpr int SWITCHSEPARATOR_WIDTH = 3;
     static const QString DEFAULT_COLORVALUE;
 
-    // What of an edge a change is about.
+    // Which property of the edge a change sets.
     enum Kind { SWITCH = 1, WIDTH = 2, COLOR = 3 };
 
     explicit EdgeToolBox(QWidget* parent);
 
-    // preview: the slider is being dragged, so it keeps its place.
+    // Shows the edge. preview: the slider is being dragged, so its position is not changed.
     void setEdge(int on, const TEdge& edge, bool preview);
     TEdge getEdge() const { return m_edge; }
     bool isEdgeOn() const { return m_on; }
     QString getColor() const;
-    // The palette answers: state 0 preview, 1 OK, 2 Cancel.
+    // Called with the answer of the palette: state 0 preview, 1 OK, 2 Cancel.
     void getColorValue(const QString& color, int state);
     QString getRgbaValue(const QString& color) const;
 
@@ -55,10 +55,11 @@ public:
     void translateText() override;
 
 Q_SIGNALS:
-    // undoFlag: 0 a preview, 1 one step of undo, 2 the palette was cancelled.
+    // Emitted when the operator has changed the edge. undoFlag: 0 for a preview, 1 for an undo step, 2 when
+    // the palette was cancelled.
     void edgeChange(int on, TEdge edge, int id, int undoFlag, int kind);
     void signalShowEdgeSlider(bool shown);
-    // The colour button was tapped.
+    // Emitted when the colour button was tapped.
     void clicked();
 
 private:

@@ -4,7 +4,7 @@
 
 class FontCombox;
 
-// The font family of the text.
+// Chooses the font family of the text.
 class FamilyToolBox : public ToolBox
 {
     Q_OBJECT
@@ -22,14 +22,14 @@ public:
 
     explicit FamilyToolBox(QWidget* parent);
 
-    // Shown without a signal; an empty or unknown one shows none.
+    // Shows the family without a signal; an empty or unknown one shows none.
     void setFontFamily(const QString& family);
-    // The family shown; empty when none is.
+    // Returns the family shown; empty when none is shown.
     QString getFontFamily() const;
 
-    // A font file has arrived in the folder of imported fonts; its name in there.
+    // Called when a font file was added to the folder of imported fonts, with the name of the file.
     void importFontFamilyNotify(const QString& file);
-    // True offers all families, false the imported ones.
+    // Sets which families are offered: with true all, with false the imported ones only.
     void modifyComboxItem(bool isAllItems);
     void hideComboxList();
     FontCombox* comboBox() const { return m_box; }
@@ -48,5 +48,5 @@ private:
 
     QLabel* m_label = nullptr;
     FontCombox* m_box = nullptr;
-    bool m_mute = false; // the box is being written from code
+    bool m_mute = false; // set while code writes to the box
 };

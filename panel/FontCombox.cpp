@@ -49,7 +49,7 @@ QString importFolderOfSettings()
     try {
         return QString::fromStdWString(SettingManager().getImportFontsPath());
     } catch (const std::exception&) {
-        return QString(); // the folder cannot be made
+        return QString(); // the folder could not be created
     }
 }
 
@@ -115,8 +115,8 @@ void FontCombox::addSpecialDefaultFont()
         m_imported.append(family);
 }
 
-// A pipe would block and a monster would fill the memory; the font system refuses what is not a font. Notices
-// name files of the folder.
+// Registers a font file. Skips pipes, which would block, and files above the size limit, and refuses paths
+// outside the folder of imported fonts. The font system itself rejects files that are not fonts.
 void FontCombox::registerFontFile(const QString& path)
 {
     const QFileInfo info(path);
@@ -154,7 +154,7 @@ void FontCombox::drawText(QPainter& painter, const QRect&)
                      painter.fontMetrics().elidedText(name, Qt::ElideRight, TEXT_RECT.width()));
 }
 
-// As wide as the widest display name in its own letters.
+// Makes the list as wide as the widest display name in its own font.
 void FontCombox::adjustPopupListSize()
 {
     KSCombobox::adjustPopupListSize();

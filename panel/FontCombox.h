@@ -6,8 +6,8 @@
 #include <QString>
 #include <QStringList>
 
-// The families to choose from: those of the appliance, and those that were imported. Rows hold the stored
-// family; what is painted is the name that it is known by. GUI thread only.
+// The list of families: those of the appliance and the imported ones. Rows hold the stored family but are
+// painted with its display name. GUI thread only.
 class FontCombox : public KSCombobox
 {
     Q_OBJECT
@@ -17,12 +17,13 @@ public:
 
     explicit FontCombox(QWidget* parent);
 
-    // True offers the appliance's families and the imported ones, false the imported ones alone. A family
-    // that the system cannot resolve is left out. The family shown stays, if it is still there.
+    // Fills the list: with true with the appliance's families and the imported ones, with false with the
+    // imported ones only. A family that the font system cannot resolve is left out. Keeps the current family
+    // if it is still in the list.
     void refreshFontListView(bool isAllItems);
-    // Registers the file of the folder of imported fonts; with all, forgets every import and registers the
-    // whole folder. fromSettings asks the settings where the folder lies, otherwise the last answer is used.
-    // Files that are no fonts are passed over.
+    // Registers one file of the folder of imported fonts; with all, drops every import and registers the
+    // whole folder. With fromSettings the path of the folder is read from the settings, otherwise the path
+    // from the last call is used. Files that are not fonts are skipped.
     void addImportFontsToApplication(bool fromSettings, bool all, const QString& file);
     QStringList importedFamilies() const { return m_imported; }
 
@@ -30,10 +31,11 @@ public:
     void setFontFamily(const QString& family);
     void setPreviousFamily(const QString& family) { m_previousFamily = family; }
     QString previousFamily() const { return m_previousFamily; }
-    // A row, or -1 for none.
+    // Selects a row; -1 for none.
     void setCurrentFamily(int index);
 
-    // Keep only what the appliance offers or was imported; what the system resolves to itself.
+    // filterAvailableForSY() keeps the families that the appliance offers or that were imported;
+    // filterAvailableFamily() those that the font system resolves to themselves.
     QStringList filterAvailableForSY(const QStringList& families) const;
     static QStringList filterAvailableFamily(const QStringList& families);
 

@@ -6,18 +6,18 @@
 #include <array>
 #include <utility>
 
-// Paints a row of the font list: the name that a family is known by, written in that family.
+// Paints a row of the font list: the display name of a family in that family.
 class FontFamilyDelegate : public CustomComboBoxDelegate
 {
     Q_OBJECT
 public:
     static constexpr int FAMILY_COUNT = 9;
-    // Stored family and display name.
+    // Pairs of stored family and display name.
     static const std::array<std::pair<QString, QString>, FAMILY_COUNT> REPLACE_FAMILY_LIST;
 
     using CustomComboBoxDelegate::CustomComboBoxDelegate;
 
-    // The display name of a stored family; most are known by their own.
+    // Returns the display name of a stored family, which for most is the family itself.
     static QString changeFamilyName(const QString& family);
 
     void paint(QPainter* painter, const QStyleOptionViewItem& option,

@@ -2,7 +2,7 @@
 
 #include "panel/ToolBox.h"
 
-// Italic on or off; a button without a label.
+// Switches italic on or off; a button without a label.
 class ItalicToolBox : public ToolBox
 {
     Q_OBJECT
@@ -14,7 +14,7 @@ public:
 
     explicit ItalicToolBox(QWidget* parent);
 
-    // 0 or 1; anything else shows off.
+    // Shows 0 off or 1 on; any other value counts as off.
     void setFontItalic(int italic);
     int getFontItalic() const { return m_italic; }
 

@@ -2,12 +2,12 @@
 
 #include "panel/ToolBox.h"
 
-// Steps the letter spacing through five levels.
+// Changes the letter spacing in five levels.
 class KerningToolBox : public ToolBox
 {
     Q_OBJECT
 public:
-    // Index of the panel's table of percentages.
+    // Index into the panel's table of percentages.
     enum Level { DOUBLESMALL = 0, SMALL = 1, NORMAL = 2, BIGGER = 3, DOUBLEBIGGER = 4 };
 
     static constexpr int ALIGNLABEL_WIDTH = 84;
@@ -22,7 +22,7 @@ public:
 
     explicit KerningToolBox(QWidget* parent);
 
-    // A level, or -1 for a spacing without a level. Shown once the box is enabled.
+    // Sets the level, or -1 for a spacing that is not a level. Shown once the box is enabled.
     void setKerning(int level) { m_level = level; }
     int getKerning() const { return m_level; }
 

@@ -8,7 +8,7 @@
 namespace
 {
 
-constexpr QPoint PALETTE_PLACE(640, 350); // in the window
+constexpr QPoint PALETTE_PLACE(640, 350); // relative to the window
 
 } // namespace
 

@@ -7,36 +7,36 @@
 class ColorPalette;
 class QWidget;
 
-// The colour palette of the property panel: whose colour it chooses, and the colours that Cancel gives back.
-// GUI thread only.
+// The colour palette of the property panel, with the property that it sets and the colours that Cancel
+// restores. GUI thread only.
 class PanelPalette
 {
 public:
-    // Whose colour the palette chooses.
+    // The property that the palette sets.
     enum Owner { NO_OWNER = 0, TEXT_COLOR_OWNER = 1, EDGE_COLOR_OWNER = 2 };
 
-    // The panel owns the palette itself.
+    // Creates the palette as a child of the panel.
     explicit PanelPalette(QWidget* panel);
 
     ColorPalette* widget() const { return m_palette; }
     Owner owner() const { return m_owner; }
 
-    // Shows the palette for the owner, at the place of the window (global) and a fixed distance. A palette
-    // that is open for the other colour is cancelled by that first. Returns false when it is open for the
-    // owner already: then it keeps what Cancel gives back.
+    // Shows the palette for the owner, at a fixed distance from the position of the window (global
+    // coordinates). A palette that is open for the other property is cancelled first. Returns false when it
+    // is already open for the owner; the saved colours stay then.
     bool open(Owner owner, const QString& color, QPoint window);
-    // What Cancel gives back, one colour a character.
+    // Sets the colours that Cancel restores, one per character.
     void setSavedColors(const QList<QString>& colors) { m_savedColors = colors; }
     const QList<QString>& savedColors() const { return m_savedColors; }
-    // Forgets owner and colours.
+    // Clears owner and saved colours.
     void forget();
 
     void cancel();
-    // Cancels the palette unless it makes the current change itself: any other change would keep the
-    // previewed colour.
+    // Cancels the palette unless the current change comes from the palette itself: after any other change the
+    // previewed colour would be kept.
     void cancelUnlessAnswering();
 
-    // While one lives, changes are those of the palette.
+    // While an instance exists, changes count as coming from the palette.
     class Answer
     {
     public:

@@ -25,7 +25,7 @@ namespace
 {
 
 constexpr int BOLD_ROW_SPACING = 24;
-constexpr int LEFT_MARGIN = 40; // the panel begins under the tools bar, left of the window's separator
+constexpr int LEFT_MARGIN = 40; // the panel starts below the tools bar, left of the window's separator
 constexpr int BLOCK_SPACING = 60;
 
 QHBoxLayout* newRow(const QList<QWidget*>& widgets)
@@ -37,7 +37,7 @@ QHBoxLayout* newRow(const QList<QWidget*>& widgets)
     return row;
 }
 
-// Whether all characters have the value of the first one.
+// Returns whether all characters have the value of the first one.
 template <typename Value>
 bool isCommon(const TText& style, Value value)
 {
@@ -56,7 +56,7 @@ bool isItalic(const TextStyle& item)
     return item.isTextItalic() != 0;
 }
 
-// Mixed characters count as not having the property.
+// Returns the flag that all characters share; 0 when they differ.
 template <typename Value>
 int commonFlag(const TText& style, Value value)
 {

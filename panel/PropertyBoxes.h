@@ -21,8 +21,8 @@ class TText;
 class TextColorToolBox;
 class ToolBox;
 
-// The ten tool boxes of the property panel as one: lays them out, shows a style in them without a change,
-// enables them and reads what they show. The panel owns the boxes. GUI thread only.
+// The ten tool boxes of the property panel: lays them out, shows a style in them without causing a change,
+// enables them and reads their values. The panel owns the boxes. GUI thread only.
 class PropertyBoxes
 {
 public:
@@ -40,24 +40,26 @@ public:
     RangeOfMoveText* const move;
 
     QList<ToolBox*> all() const;
-    // The caller takes the layout over.
+    // Creates the layout, which the caller takes ownership of.
     QLayout* createLayout() const;
 
-    // Shows a style with at least one character, of mixed ones what they have in common. edgePreview: the
-    // edge is that of a slider that is still dragged.
+    // Shows a style of at least one character; of mixed characters what they have in common. edgePreview: the
+    // edge comes from a slider that is still being dragged.
     void show(const TText& style, bool edgePreview);
     void show(const FontStyle& style);
-    // What the boxes show, as the style of one character without a text.
+    // Returns the values of the boxes as the style of one character without text.
     TText shownStyle(const QString& defaultFamily) const;
-    // The offsets that belong to the shadow shown.
+    // Sets the offsets of the shadow shown.
     void setShadowOffsets(const TShadow& offsets) { m_shadowOffsets = offsets; }
 
-    // Back to new boxes, disabled.
+    // Returns all boxes to their initial values, disabled.
     void reset();
-    // Enables the boxes that apply to every selection, and the others as allowed last.
+    // Enables the boxes that are available for every selection, and the others as set by the last call of
+    // allow().
     void enable();
     void disable();
-    // Shadow and align apply to a whole text, moving to an object that is selected as one.
+    // Sets whether shadow and align are available (whole text selected), and whether moving is (object
+    // selected).
     void allow(bool shadowAndAlign, bool moving);
 
 private:

@@ -35,7 +35,7 @@ constexpr int ROW_SPACING = 24;
 constexpr int LABEL_SPACING = 8;
 constexpr int RANGE_WIDTH = 110;
 constexpr int RANGE_LABEL_WIDTH = 62;
-constexpr int SLACK = 2; // widths are rounded
+constexpr int SLACK = 2; // tolerance, since widths are rounded
 
 } // namespace
 
@@ -74,7 +74,7 @@ RangeOfMoveText::RangeChoice RangeOfMoveText::addRangeChoice(int id)
     return choice;
 }
 
-// The description stands in the corner over the left arm of the cross, the choices below it.
+// Places the description above the left arm of the cross and the choices below it.
 void RangeOfMoveText::createLayout()
 {
     auto* grid = newLayout<QGridLayout>();
@@ -155,7 +155,7 @@ bool RangeOfMoveText::eventFilter(QObject* watched, QEvent* event)
     return ToolBox::eventFilter(watched, event);
 }
 
-// Leaves the text as little room as it needs for its lines, so that no word stands on the last one alone.
+// Narrows the description as far as its number of lines allows, so that the lines are about equally long.
 void RangeOfMoveText::balanceDescription()
 {
     m_description->setContentsMargins(0, 0, 0, 0);

@@ -4,7 +4,8 @@
 
 class KSRadiobutton;
 
-// Moves the text object a step at a tap: four directions in a cross, and a choice of two distances.
+// Moves the text object by one step per tap: four direction buttons in a cross, and a choice of two
+// distances.
 class RangeOfMoveText : public ToolBox
 {
     Q_OBJECT
@@ -36,7 +37,7 @@ public:
 
     explicit RangeOfMoveText(QWidget* parent);
 
-    // Pixels of the canvas, 2 or 10.
+    // Returns the distance of a step in pixels of the canvas, 2 or 10.
     int range() const { return m_range; }
 
     void setWidgetEnabled() override;
@@ -47,7 +48,7 @@ public:
     bool eventFilter(QObject* watched, QEvent* event) override;
 
 Q_SIGNALS:
-    // direction is one of the button indices.
+    // Emitted when a direction was tapped. direction: one of the button indices.
     void moveRangeChanged(int range, int direction, int id);
 
 private:

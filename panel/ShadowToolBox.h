@@ -19,7 +19,7 @@ public:
 
     explicit ShadowToolBox(QWidget* parent);
 
-    // 0 off, 1 right down, 2 centre down, 3 left down; USELESS_VALUE selects none. Shown once the box is
+    // Sets 0 off, 1 right down, 2 centre down, 3 left down; USELESS_VALUE selects none. Shown once the box is
     // enabled.
     void setShadow(int style) { m_style = style; }
     int getShadow() const { return m_style; }

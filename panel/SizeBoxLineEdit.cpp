@@ -37,7 +37,7 @@ void SizeBoxLineEdit::paintEvent(QPaintEvent*)
     drawText(painter);
 }
 
-// Where the whole text stands.
+// Returns the rectangle of the whole text.
 QRect SizeBoxLineEdit::getTextRect() const
 {
     return fontMetrics().boundingRect(rect(), Qt::AlignCenter, text());

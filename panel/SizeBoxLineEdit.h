@@ -2,14 +2,14 @@
 
 #include <QLineEdit>
 
-// The field of the size box: it paints its text and its selection itself, in the middle of the drawn box.
+// The field of the size box: paints its text and its selection itself, centred in the drawn box.
 class SizeBoxLineEdit : public QLineEdit
 {
     Q_OBJECT
 public:
     explicit SizeBoxLineEdit(QWidget* parent = nullptr);
 
-    // 1 is enabled; any other value paints the text grey.
+    // Sets the look: 1 is enabled; any other value makes the text grey.
     void setState(int state);
     int state() const { return m_state; }
 

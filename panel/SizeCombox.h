@@ -2,7 +2,7 @@
 
 #include "touchui/KSCombobox.h"
 
-// The box of the font size, whose list is wider than the narrow box.
+// The box of the font size, with a list wider than the box.
 class SizeCombox : public KSCombobox
 {
     Q_OBJECT

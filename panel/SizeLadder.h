@@ -3,29 +3,29 @@
 #include <QList>
 #include <QString>
 
-// The steps that the two size buttons take, and what a selection of sizes looks like. Sizes are pixels of the
-// 1920 raster. Pure functions; any thread.
+// The steps of the two size buttons, and the display of a selection of sizes. Sizes are pixels of the 1920
+// raster. Pure functions; any thread.
 namespace SizeLadder
 {
 
 constexpr int MAXSIZE = 999;
 constexpr int MINSIZE = 20;
 
-// What the drop-down offers.
+// Returns the sizes of the drop-down list.
 const QList<int>& comboBoxSizes();
-// The ladder.
+// Returns all steps in ascending order.
 const QList<int>& totalSizes();
 
-// The first step above the value; 999 stays. A value off the ladder joins it.
+// Returns the first step above the value; 999 for 999. The value need not be a step.
 int getNextData(int value);
-// The step before the first one that is not below the value; 20 stays.
+// Returns the last step below the value; 20 for 20.
 int getPreviousData(int value);
 
 bool allIsMin(const QList<int>& sizes);
 bool allIsMax(const QList<int>& sizes);
-// The smallest size, 0 without any.
+// Returns the smallest size, 0 if there is none.
 int getMinSize(const QList<int>& sizes);
-// The one size, or the smallest one and a plus sign; empty without any.
+// Returns the size when all are equal, otherwise the smallest one and a plus sign; empty if there is none.
 QString displayText(const QList<int>& sizes);
 
 } // namespace SizeLadder

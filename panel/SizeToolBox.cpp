@@ -30,7 +30,8 @@ const char PT_STYLE[] = "QLabel {color:rgb(220, 220, 220); font:20px;}";
 const char PT_DISABLED_STYLE[] = "QLabel {color:rgb(40, 40, 40); font:20px;}";
 constexpr int TEXT_ENABLED = 1;
 constexpr int TEXT_DISABLED = 0;
-// How the field describes itself to the soft keyboard: its kind and title; three parts select all of it.
+// Parts of the name with which the field describes itself to the soft keyboard: kind, title, and "2" to
+// select the whole text.
 constexpr int KEYBOARD_KIND = 1;
 const char SELECT_ALL[] = "2";
 
@@ -201,7 +202,7 @@ void SizeToolBox::fontSizeToPrevious()
     step(&SizeLadder::getPreviousData);
 }
 
-// Each character climbs by itself.
+// Steps each size on its own, so that differences stay.
 void SizeToolBox::step(int (*next)(int))
 {
     clearFocusOfSizeBoxLineEdit(true);
@@ -229,7 +230,7 @@ bool SizeToolBox::eventFilter(QObject* object, QEvent* event)
         return true;
     }
     case QEvent::FocusOut: {
-        // A window of another process, such as the keyboard itself, does not end the field.
+        // Switching to a window of another process, such as the keyboard itself, does not end the edit.
         const bool leftProcess = static_cast<QFocusEvent*>(event)->reason() == Qt::ActiveWindowFocusReason &&
                                  QGuiApplication::focusWindow() == nullptr;
         if (!leftProcess)
@@ -244,7 +245,7 @@ bool SizeToolBox::eventFilter(QObject* object, QEvent* event)
     }
 }
 
-// A finger on the field is its mouse; one beside it belongs to the box.
+// Turns a finger on the field into mouse events. Touches outside the field go to the box.
 bool SizeToolBox::doLineEditEvent(QEvent* event)
 {
     switch (event->type()) {
@@ -302,7 +303,8 @@ void SizeToolBox::sendMouseToLineEdit(QEvent::Type type, const QPointF& position
     QCoreApplication::sendEvent(m_edit, &mouse);
 }
 
-// The touch was cancelled: the field is not clicked, and an edit that the touch began is not begun.
+// Called when the touch was cancelled: releases the field without a click and ends an edit that this touch
+// began.
 void SizeToolBox::letGoOfLineEdit()
 {
     sendMouseToLineEdit(QEvent::MouseButtonRelease, QPointF(-1, -1));
@@ -342,18 +344,20 @@ void SizeToolBox::enterPressed()
 void SizeToolBox::editSizeFinished()
 {
     const int size = m_edit->text().toInt();
-    showText(QString::number(size)); // or the box would find the row of it by itself, as a change
+    // Otherwise the box would look for the row of this text and report it as a change.
+    showText(QString::number(size));
     leaveEditing();
     setAllSizes(size);
 }
 
-// The field was left by another way than Enter: what is not a size is refused aloud, the rest is dropped.
+// Called when the field was left without Enter: shows a warning if the text is not a size, and restores the
+// last valid text.
 void SizeToolBox::editingLeft()
 {
     if (!isEditing())
         return;
-    // What was typed on the keyboard is only in the verdict about it; the question about the field overwrites
-    // that.
+    // The result of the validator has to be kept first: hasAcceptableInput() below validates the text of the
+    // field and overwrites it.
     const bool wasValid = m_state != State::Invalid;
     m_state = State::Shown;
     if (wasValid && m_edit->hasAcceptableInput()) {
@@ -366,7 +370,7 @@ void SizeToolBox::editingLeft()
 
 void SizeToolBox::resetLastValidTextAndShowWarning()
 {
-    // The display of a mixed selection was merely left alone.
+    // The display of a mixed selection, such as "32+", was not edited.
     if (m_lastValidText.contains(QLatin1Char('+')) && m_edit->text() == m_lastValidText)
         return;
     showText(m_lastValidText);
@@ -388,8 +392,8 @@ void SizeToolBox::clearFocusOfSizeBoxLineEdit(bool clear)
     leaveEditing();
 }
 
-// Qt asks for the end of the soft keyboard only where a field that takes text loses the focus, which a
-// read-only one does not take. Another field may have the keyboard by now.
+// Qt closes the soft keyboard only when an editable field loses the focus, and this field is read-only by
+// then. The keyboard stays open if another field has it.
 void SizeToolBox::closeKeyboard() const
 {
     KSInputContext* input = KSInputContext::instance();

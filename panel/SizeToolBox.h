@@ -13,8 +13,8 @@ class OneFinger;
 class QTouchEvent;
 class SizeBoxLineEdit;
 
-// The font size: a box to choose from a list or to type in, and two buttons that step through the ladder. It
-// keeps one size for each selected character, so that stepping keeps their differences.
+// Sets the font size: a box to choose from a list or to type in, and two buttons for the next and previous
+// step. Keeps one size for each selected character, so that steps preserve their differences.
 class SizeToolBox : public ToolBox
 {
     Q_OBJECT
@@ -38,15 +38,15 @@ public:
 
     explicit SizeToolBox(QWidget* parent);
 
-    // One size a character; shown without a signal.
+    // Shows the sizes, one per character, without emitting sizeChange.
     void setFontSize(const QList<int>& sizes);
     QList<int> fontSizes() const { return m_sizes; }
-    // The size that is shown, the smallest of a mixed selection.
+    // Returns the size shown, the smallest one of a mixed selection.
     int getFontSize() const;
 
-    // True drops a size that is being typed: the last valid one is shown again and the field is left.
+    // Discards, with true, a size that is being typed: shows the last valid one and leaves the field.
     void clearFocusOfSizeBoxLineEdit(bool clear);
-    // The validator's verdict on what is being typed.
+    // Called with the result of the validator for the text being typed.
     void setValid(bool valid);
     bool isEditing() const { return m_state != State::Shown && m_state != State::Writing; }
     void hideComboxList();
@@ -61,22 +61,22 @@ public:
 Q_SIGNALS:
     void sizeChange(QList<int> sizes, int id);
     void signalShowSizeComboxList(bool shown);
-    // Typing has ended, accepted or not.
+    // Emitted when typing has ended, whether the size was accepted or not.
     void signalSizeToolBoxEditDone();
-    // What the box shows: a row of the list, or -1, and a size.
+    // Emitted with what the box shows: the row of the list (-1: not in the list) and the size.
     void setComboxIndex(int index);
     void setCurrentSize(int size);
-    // A valid size was typed and entered.
+    // Emitted when a valid size was entered.
     void validEditingText();
 
 private:
-    // What the field does now.
+    // State of the field.
     enum class State {
-        Shown,   // it shows the size of what is selected
-        Writing, // it is being written from code
-        Touched, // it is typed into, since the touch that is still on it
-        Valid,   // it is typed into, and holds a size
-        Invalid  // it is typed into, and holds no size
+        Shown,   // shows the size of the selection
+        Writing, // is being written by code
+        Touched, // edited; the touch that began the edit is still down
+        Valid,   // edited; contains a size
+        Invalid  // edited; does not contain a size
     };
 
     void createBox();
@@ -88,7 +88,7 @@ private:
     void updateButtons();
     void showText(const QString& text);
 
-    // Typing.
+    // Typing
     bool doLineEditEvent(QEvent* event);
     bool onTouchEvent(const QTouchEvent* event);
     void sendMouseToLineEdit(QEvent::Type type, const QPointF& position);
@@ -105,7 +105,7 @@ private:
     QLabel* m_label = nullptr;
     KSCombobox* m_box = nullptr;
     SizeBoxLineEdit* m_edit = nullptr;
-    std::unique_ptr<OneFinger> m_finger; // on the field
+    std::unique_ptr<OneFinger> m_finger; // on the text field
     QLabel* m_ptLabel = nullptr;
     KSPushbutton* m_previous = nullptr;
     KSPushbutton* m_next = nullptr;

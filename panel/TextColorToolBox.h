@@ -4,7 +4,7 @@
 
 class ColorButton;
 
-// The button that shows the colour of the text and opens the palette for it.
+// Shows the colour of the text on a button that opens the palette.
 class TextColorToolBox : public ToolBox
 {
     Q_OBJECT
@@ -17,10 +17,10 @@ public:
 
     explicit TextColorToolBox(QWidget* parent);
 
-    // "#rrggbb".
+    // Shows the colour, "#rrggbb".
     void setColor(const QString& color);
     QString getColor() const { return m_color; }
-    // The palette answers: state 0 preview, 1 OK, 2 Cancel.
+    // Called with the answer of the palette: state 0 preview, 1 OK, 2 Cancel.
     void getColorValue(const QString& color, int state);
     QString getRgbaValue(const QString& color) const;
 
@@ -30,7 +30,7 @@ public:
 
 Q_SIGNALS:
     void textColorChange(QString color, int id, int state);
-    // The button was tapped.
+    // Emitted when the button was tapped.
     void clicked();
 
 private:

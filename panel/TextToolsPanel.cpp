@@ -102,7 +102,7 @@ void TextToolsPanel::setModuleInfo(SystemSetupDef::emInformationModel model)
         m_defaultFamily = QString::fromLatin1(CHINESE_FAMILY);
 }
 
-// With nothing selected the panel shows what a new text begins with, which a new language changes.
+// While nothing is selected the panel shows the style of a new text, whose family depends on the language.
 void TextToolsPanel::displayInputLanguage(SystemSetupDef::emInputLanguageType language)
 {
     const QString before = std::exchange(m_defaultFamily, familyOf(m_model, language));
@@ -199,10 +199,10 @@ void TextToolsPanel::slotAbsoluteShowCanvasMenu(bool shown)
     m_boxes.size->clearFocusOfSizeBoxLineEdit(shown);
 }
 
-// The change path: what the operator does in a tool box changes the working copy and is sent to the canvas
+// The change path: an action in a tool box changes the working copy and is sent to the canvas
 
-// Makes a change of any kind. An empty log line is left out. A copy is sent, since the answer may replace the
-// working copy meanwhile.
+// Carries out a change of any property. An empty log line is not written. A copy is sent, since the receivers
+// may cause the working copy to be replaced.
 template <typename Edit>
 void TextToolsPanel::change(const std::wstring& log, int id, int undoFlag, Edit edit)
 {
@@ -215,7 +215,7 @@ void TextToolsPanel::change(const std::wstring& log, int id, int undoFlag, Edit 
     edit();
     TText copy(*m_style.record());
     Q_EMIT textStyleChange(&copy, id, undoFlag);
-    // What the next run starts with.
+    // The style is stored for the next run.
     if (undoFlag == COMMITTED && id != TextObjectConstants::PropertyPosition && m_style.record() &&
         !m_style.record()->textItems().empty())
         m_controller.setLastTextStyle(m_style.fontStyle());
@@ -261,7 +261,7 @@ void TextToolsPanel::changeEdge(int on, TEdge edge, int id, int undoFlag, int ki
     m_edgePreview = false;
 }
 
-// Characters keep the values of their edge that the change is not about.
+// Changes only the property of the edge that kind names; the others may differ between characters.
 void TextToolsPanel::editEdge(int on, const TEdge& edge, int undoFlag, int kind)
 {
     if (undoFlag == ColorPalette::CANCEL) {
@@ -363,7 +363,7 @@ void TextToolsPanel::getColorValue(QString color, int state)
     }
 }
 
-// The reverse path: what is selected on the canvas is shown in the tool boxes, and nothing is sent back
+// The reverse path: the selection on the canvas is shown in the tool boxes, and nothing is sent back
 
 void TextToolsPanel::updateTextStyle(TText* style)
 {

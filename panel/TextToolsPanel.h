@@ -13,16 +13,16 @@
 #include <QWidget>
 #include <string>
 
-// The property panel under the canvas. It keeps a working copy of the style of what is selected. A tool box
-// that the operator uses changes the copy, which goes to the canvas with textStyleChange; what the canvas
-// selects comes back with updateTextStyle and is shown without an answer.
+// The property panel below the canvas. It keeps a working copy of the style of the selection. When the
+// operator uses a tool box, the copy is changed and sent to the canvas with textStyleChange(); a new
+// selection on the canvas arrives with updateTextStyle() and is shown without sending anything back.
 //
 // Sizes are pixels of the 1920 raster, places pixels of the 1280 canvas. GUI thread only.
 class TextToolsPanel : public QWidget
 {
     Q_OBJECT
 public:
-    // Directions of a shadow.
+    // Offsets of a shadow to each side.
     static constexpr int LEFT_X = -WorkingStyle::SHADOW_OFFSET;
     static constexpr int RIGHT_X = WorkingStyle::SHADOW_OFFSET;
     static constexpr int UP_Y = -WorkingStyle::SHADOW_OFFSET;
@@ -39,19 +39,18 @@ public:
     explicit TextToolsPanel(QWidget* parent);
     ~TextToolsPanel() override;
 
-    // Nothing is selected: the boxes are disabled and show the style that the last change left.
+    // Called when nothing is selected: disables the boxes, which show the style of the last change.
     void initTextToolsPanel();
-    // Whether changes reach the canvas.
+    // Sets whether changes are sent to the canvas.
     void setSignalValue(bool enabled);
     void setModuleInfo(SystemSetupDef::emInformationModel model);
-    // Sets the family that a text without one gets; shows it, when it is another one, unless a text is
-    // selected.
+    // Sets the default family for new text. Shows it, if it has changed, unless a text is selected.
     void displayInputLanguage(SystemSetupDef::emInputLanguageType language);
     QString defaultFamily() const { return m_defaultFamily; }
     void translateText();
 
     bool colorPaletteIsShown() const;
-    // Masks on the palette.
+    // Shows or hides a mask on the palette.
     void showDialogMaskWidget(bool show);
     void showMessageMaskWidget(bool show);
 
@@ -60,13 +59,14 @@ public:
     void hideFontFamilyComboxList();
     void hideFontSizeComboxList();
 
-    // The working copy, null until the first style arrives.
+    // Returns the working copy; null until the first style arrives.
     const TText* workingStyle() const { return m_style.record(); }
 
 Q_SIGNALS:
-    // The style is valid during the call only. undoFlag: 0 a preview, 1 a change, 2 a cancelled palette.
+    // Emitted when the operator changed the style, which is valid during the call only. undoFlag: 0 for a
+    // preview, 1 for a change, 2 when the palette was cancelled.
     void textStyleChange(TText* style, int id, int undoFlag);
-    // What the panel shows, for a new text object; valid during the call only.
+    // Reports what the panel shows as the style for a new text object; valid during the call only.
     void signalUpdateCurrentTextProperty(TText& style);
     void sendTitlerWindowRect(QRect rect);
     void signalNotifyEditAreaSizeToolBoxEditDone();
@@ -75,8 +75,8 @@ Q_SIGNALS:
     void signalShowFontSizeComboxList(bool shown);
 
 public Q_SLOTS:
-    // The style of what is selected, one TextStyle a character; the caller keeps it. A record without
-    // characters is ignored.
+    // Shows the style of the selection, one TextStyle per character; the caller keeps ownership. A record
+    // without characters is ignored.
     void updateTextStyle(TText* style);
 
     void changeFamily(QString family, int id);
@@ -98,12 +98,12 @@ public Q_SLOTS:
     void getColorValue(QString color, int state);
     void titlerWindowRectSlot(QRect rect);
     void slotImportNewFontFamlies(QString file);
-    // True offers all families, false the imported ones.
+    // Sets which families are offered: with true all, with false the imported ones only.
     void modifyFontFamilyComboxItem(bool isAllItems);
     void slotCanvasSceneMouseTouched();
     void slotHideColorPaletteWhenCloseSoftWare();
-    // The selection, its text or the title is about to change: an open palette is cancelled, and the width
-    // that an open slider shows is committed.
+    // Called before the selection, its text or the title changes: cancels an open palette and commits the
+    // width that an open slider shows.
     void slotEndPreview();
     void slotClearSizeBoxLineEditFocus(bool clear);
     void slotShowFontFamilyComboxList(bool shown);
@@ -120,7 +120,7 @@ private:
     PanelPalette m_palette;
     TextToolsPanelController m_controller;
     WorkingStyle m_style;
-    bool m_changesPass = false; // to the canvas
+    bool m_changesPass = false; // whether changes are sent to the canvas
     bool m_edgePreview = false;
     QString m_defaultFamily;
     QRect m_titlerWindowRect;

@@ -4,13 +4,13 @@
 
 #include <QStringList>
 
-// The panel's link to the stored settings and to the font system. GUI thread.
+// Gives the panel access to the stored settings and to the font system. GUI thread only.
 class TextToolsPanelController
 {
 public:
-    // Every family, whatever it can write.
+    // Returns all families of the font system, whatever scripts they support.
     QStringList getFontLib() const;
-    // What the last run left; the defaults when there is nothing to read.
+    // Returns the style stored by the last run; the defaults when there is none.
     FontStyle getLastTextStyle() const;
     void setLastTextStyle(FontStyle style) const;
 };

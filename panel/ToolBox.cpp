@@ -64,7 +64,7 @@ KSPushbutton* ToolBox::addButton(Piece piece, const QSize& size, const QString& 
     return button;
 }
 
-// A pressed button swaps its picture and nothing else.
+// A press changes the picture of a button, but not its icon.
 void ToolBox::connectLooks(KSPushbutton* button)
 {
     connect(button, &QAbstractButton::pressed, button, [button] {
@@ -120,7 +120,7 @@ void ToolBox::resetInitializeStyle()
     setWidgetDisabled();
 }
 
-// A style sheet costs more than all the rest, so a box that keeps its state is left alone.
+// Does nothing when the state stays, since setting style sheets is slow.
 void ToolBox::applyState(bool enabled)
 {
     if (m_boxEnabled == enabled)
@@ -167,7 +167,7 @@ void ToolBox::setButtonChosen(KSPushbutton* button)
         showIcon(*entry);
 }
 
-// A look is read and decoded once.
+// Reads and decodes each icon file once.
 QIcon ToolBox::iconOf(Button& entry, const QString& name)
 {
     auto known = entry.icons.find(name);
@@ -176,7 +176,8 @@ QIcon ToolBox::iconOf(Button& entry, const QString& name)
     return *known;
 }
 
-// A look of its own for each state; a selected piece of a switch keeps its look while it cannot be tapped.
+// Chooses the icon for the state of the button. The active button of a switch keeps its selected icon
+// although it cannot be tapped.
 void ToolBox::showIcon(Button& entry)
 {
     if (entry.icon.isEmpty())

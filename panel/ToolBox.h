@@ -11,63 +11,64 @@ class KSPushbutton;
 class QHBoxLayout;
 class QLabel;
 
-// What the boxes of the property panel share: labels, touch buttons with icons, separators between the
-// buttons of a switch, and how all of them look enabled, disabled, pressed and selected. A box emits its
-// change signal for the operator's taps only; what is set from code is shown in silence.
+// Base class of the boxes of the property panel: labels, touch buttons with icons, separators between the
+// buttons of a switch, and their looks when enabled, disabled, pressed and selected. A box emits its change
+// signal only for actions of the operator, not for values set from code.
 //
-// Labels, buttons and separators are owned by the box. GUI thread only.
+// The box owns labels, buttons and separators. GUI thread only.
 class ToolBox : public QWidget
 {
     Q_OBJECT
 public:
-    // Labels that stand on the left of a row.
+    // Styles of the labels on the left of a row.
     static const QString LABEL_REST_STYLE;
     static const QString LABEL_DISABLED_STYLE;
-    // What a button that shows a colour has beside the colour.
+    // Declarations of a button that shows a colour, apart from the colour.
     static const QString COLORBUTTON_STYLE;
     static const QString SWITCHSEPARATOR_STYLE;
     static const QString SWITCHSEPARATOR_DISABLED_STYLE;
     static constexpr QSize ICON_SIZE{48, 48};
-    // Ends of the names of an icon's other forms.
+    // Suffixes of the file names of an icon's other states.
     static constexpr char SELECTED_SUFFIX[] = "_Selected";
     static constexpr char DISABLED_SUFFIX[] = "_Disabled";
-    // Resource path of a picture of the panel.
+    // Returns the resource path of a picture of the panel.
     static QString iconPath(const char* name);
-    // The picture string of a text panel's button that is round at the given ends.
+    // Returns the picture string of a panel button that is round at the given ends.
     static QString buttonImages(bool roundLeft, bool roundRight);
-    // Pressing and releasing the button swaps its picture.
+    // Makes the button change its picture when it is pressed and released.
     static void connectLooks(KSPushbutton* button);
 
     explicit ToolBox(QWidget* parent);
 
-    // Enabled, the box shows the value that was set last.
+    // Enables the box, which then shows the value that was set last.
     virtual void setWidgetEnabled();
     virtual void setWidgetDisabled();
     bool isBoxEnabled() const { return m_boxEnabled; }
-    // The value and the looks of a new box, disabled.
+    // Resets the box to its initial value and disables it.
     virtual void resetInitializeStyle();
     virtual void translateText() {}
 
 Q_SIGNALS:
-    // Emitted before the box acts: a size that is being typed is dropped first.
+    // Emitted before the box acts, to discard a size that is being typed.
     void signalClearSizeBoxLineEditFocus(bool clear);
 
 protected:
-    // Which ends of a button are round: a whole button, or a piece of a switch.
+    // Position of a button in a switch, which decides which of its ends are round.
     enum Piece { Whole, LeftPiece, MiddlePiece, RightPiece };
 
-    // icon: path of the icon at rest; its other forms lie beside it. Empty for a button with a text.
+    // Adds a button. icon: path of the icon at rest, next to the files for its other states; empty for a
+    // button with a text.
     KSPushbutton* addButton(Piece piece, const QSize& size, const QString& icon = QString());
-    // Styles are applied with the box's state.
+    // Adds a label; the box applies the style for its state.
     QLabel* addLabel(const QSize& size, const QString& restStyle = LABEL_REST_STYLE,
                      const QString& disabledStyle = LABEL_DISABLED_STYLE);
     QWidget* addSeparator(int width, int height);
     QHBoxLayout* addRow(int height);
 
-    // Enabled and disabled look of one button, for boxes whose buttons differ.
+    // Sets the enabled state and look of one button, for boxes whose buttons differ.
     void setButtonEnabled(KSPushbutton* button, bool enabled);
     void setButtonSelected(KSPushbutton* button, bool selected);
-    // The chosen piece of a switch: it looks selected and cannot be tapped again.
+    // Marks the active button of a switch: it looks selected and cannot be tapped.
     void setButtonChosen(KSPushbutton* button);
 
 private:
@@ -75,7 +76,7 @@ private:
         KSPushbutton* button;
         QString icon;
         QString shownIcon;
-        QHash<QString, QIcon> icons; // by their paths
+        QHash<QString, QIcon> icons; // by path
     };
     struct Styled {
         QWidget* widget;

@@ -27,7 +27,7 @@ const QList<TShadow>& WorkingStyle::shadows()
     return table;
 }
 
-// The edit gets the style of a character and its index.
+// Calls the edit with each character's style and its index.
 template <typename Edit>
 void WorkingStyle::editAll(Edit edit)
 {

@@ -1,4 +1,3 @@
-// Fingers on the canvas and the panel of the window and on what these open.
 #pragma once
 
 #include "MonkeyFingers.h"
@@ -10,6 +9,7 @@
 #include <QAction>
 #include <QInputMethodEvent>
 
+// Random fingers on the canvas and the panel of the window, and on the popups that these open.
 class CanvasFingers : public MonkeyFingers
 {
 public:
@@ -27,7 +27,7 @@ public:
         }
     }
 
-    // The actions of the window's undo stack.
+    // Returns the actions of the window's undo stack.
     const QList<QAction*>& undoAndRedo() const { return m_undoAndRedo; }
 
 protected:
@@ -44,13 +44,13 @@ protected:
         return below(10) < 7 ? pointOnCanvas() : within(TitlerWindow::TEXT_PROPERTY_RECT);
     }
 
-    // Timers stand still here, so that a run does not depend on the speed of the machine; what they would
-    // have done happens at random instead.
+    // Calls at random what timers would call: the timers are stopped, so that a run does not depend on the
+    // speed of the machine.
     void betweenTouches() override
     {
         const int kind = below(60);
         if (kind < 40)
-            m_view.mouseClick(); // the next tap is no double tap
+            m_view.mouseClick(); // the next tap will not be part of a double tap
         else if (kind < 44)
             type();
         else if (kind == 44)

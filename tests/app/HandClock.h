@@ -1,5 +1,3 @@
-// The time of a program whose timers stand still, moved by hand: those that are due in the time that passes
-// fire in their turn, as often as they would.
 #pragma once
 
 #include "MonkeyGround.h"
@@ -9,10 +7,12 @@
 #include <private/qeventdispatcher_unix_p.h>
 #include <private/qunixeventdispatcher_qpa_p.h>
 
+// A clock for a program whose timers are stopped. When the test advances it, the timers that become due fire
+// in order, each as often as its interval requires.
 class HandClock
 {
 public:
-    // Before the application is made: chooses a dispatcher that tells of its timers.
+    // Installs an event dispatcher whose timers can be listed. Call before the application is made.
     static void install() { QCoreApplication::setEventDispatcher(new QUnixEventDispatcherQPA); }
 
     void pass(int milliseconds)
@@ -49,7 +49,7 @@ private:
         MonkeyGround::Application::instance()->frozen = true;
     }
 
-    // A timer that was started since the last time is taken as just started.
+    // Updates the list of timers. One started since the last call counts as started now.
     void updateTimers()
     {
         const auto* dispatcher = static_cast<QEventDispatcherUNIXPrivate*>(
@@ -58,11 +58,11 @@ private:
         for (const QTimerInfo* info : dispatcher->timerList) {
             const Timer started{info->interval, m_now + info->interval, info->obj};
             const Timer known = m_timers.value(info->id);
-            running.insert(info->id, known.object == info->obj ? known : started); // ids are used again
+            running.insert(info->id, known.object == info->obj ? known : started); // ids are reused
         }
         m_timers.swap(running);
     }
 
-    QMap<int, Timer> m_timers; // by their ids
+    QMap<int, Timer> m_timers; // by id
     qint64 m_now = 0;          // milliseconds
 };

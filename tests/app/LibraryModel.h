@@ -1,5 +1,3 @@
-// A plain model of a title folder with its one undo stack: what list, files, selection and context list must
-// be after each step. It has no widgets, no files and no undo framework; records are kept by value.
 #pragma once
 
 #include "document/TText.h"
@@ -14,44 +12,46 @@
 #include <cmath>
 #include <optional>
 
+// A plain model of a title folder with its undo stack: the expected state of list, files, selection and edit
+// context after each step. It uses no widgets, no files and no undo framework; records are kept by value.
 class LibraryModel
 {
 public:
     static constexpr int UNDO_LIMIT = 25;
 
-    // Text objects by their number.
+    // Text objects by id.
     using Texts = QMap<int, TText>;
 
     struct Title {
-        Texts saved;          // what its file holds
-        bool settled = false; // its pictures have been made from its texts since the folder was opened
+        Texts saved;          // the contents of its file
+        bool settled = false; // whether its pictures were made from its texts since the folder was opened
     };
 
     struct Command {
         enum Kind { PASTE, DELETE, MOVE, FOCUS, CREATE_TEXT, DELETE_TEXT, EDIT_TEXT, MOVE_TEXT };
         Kind kind;
-        QString title;                    // that it acts on
-        QString other = {};               // FOCUS: the title before
-        int position = -1;                // PASTE: behind which; DELETE: where it was; MOVE: from where
-        int selected = -1;                // PASTE: selected before; MOVE: to where
+        QString title;                    // the title that the command changes
+        QString other = {};               // FOCUS: the title selected before
+        int position = -1;                // PASTE: the row before it; DELETE: its row; MOVE: the old row
+        int selected = -1;                // PASTE: the row selected before; MOVE: the new row
         bool wasSelected = false;         // DELETE
-        bool isNew = false;               // DELETE: made since the request
+        bool isNew = false;               // DELETE: whether it was created during the request
         int id = 0;                       // of the text object
-        std::optional<TText> before = {}; // CREATE_TEXT: what undo took away
+        std::optional<TText> before = {}; // CREATE_TEXT: the object removed by undo
         std::optional<TText> after = {};
         QPointF from = {};
         QPointF to = {};
     };
 
     QStringList order;
-    QMap<QString, Title> titles; // all that were ever seen, listed or not
-    QSet<QString> context;       // made since the request
+    QMap<QString, Title> titles; // all titles so far, listed or not
+    QSet<QString> context;       // titles created during the request
     QString selected;
     QString canvas;
-    Texts live; // on the canvas
+    Texts live; // objects on the canvas
     bool pictureNeeded = false;
 
-    // The folder is opened with these titles.
+    // Opens the folder with these titles.
     void open(const QStringList& stems)
     {
         order = stems;
@@ -77,7 +77,7 @@ public:
         mClean = 0;
     }
 
-    // Titles that the operator has or can bring back.
+    // Returns the titles that are listed or can be restored by undo or redo.
     QSet<QString> reachable() const
     {
         QSet<QString> stems(order.begin(), order.end());
@@ -87,7 +87,7 @@ public:
         return stems;
     }
 
-    // The steps on the stack, with a bar before the one to be done next.
+    // Returns the commands on the stack, with a bar before the next one to be redone.
     QString stack() const
     {
         static const char* const NAMES[] = {"paste",       "delete",      "move",      "focus",
@@ -99,7 +99,7 @@ public:
         return told.join(QStringLiteral(", "));
     }
 
-    // Steps of the operator. A title's texts come with it.
+    // Actions of the operator. A pasted title brings its texts with it.
     void paste(const QString& stem, const Texts& texts, int behind)
     {
         titles[stem].saved = texts;
@@ -138,7 +138,7 @@ public:
         Command command{Command::FOCUS, stem, selected};
         changeFocus(stem);
         if (mIndex == mClean)
-            return; // a mere look around is no step
+            return; // selecting a title is not an undo step while the stack is clean
         if (mIndex > 0 && mCommands[mIndex - 1].kind == Command::FOCUS) {
             dropRedo();
             mCommands[mIndex - 1].title = stem;
@@ -199,7 +199,7 @@ public:
             perform(mCommands[mIndex++], true);
     }
 
-    // The canvas makes the pictures of the title that it shows.
+    // Makes the pictures of the title shown, as the canvas does.
     void leave()
     {
         if (pictureNeeded && !canvas.isEmpty())
@@ -207,7 +207,7 @@ public:
         pictureNeeded = false;
     }
 
-    // Whether the pictures on disk must be those of the saved texts, once all have been written.
+    // Returns whether the pictures on the disk must match the saved texts after all pictures are written.
     bool hasCurrentPictures(const QString& stem) const
     {
         return titles.value(stem).settled && !(stem == canvas && pictureNeeded);
@@ -217,7 +217,7 @@ public:
 
     static bool isSame(const TText& a, const TText& b)
     {
-        constexpr float ROUNDED = 0.01F; // places are written with few digits
+        constexpr float ROUNDED = 0.01F; // files store positions with few digits
         return a.getTextObjectID() == b.getTextObjectID() && a.getText() == b.getText() &&
                std::abs(a.getXValue() - b.getXValue()) < ROUNDED &&
                std::abs(a.getYValue() - b.getYValue()) < ROUNDED && a.getZValue() == b.getZValue() &&
@@ -255,7 +255,7 @@ private:
         live = titles.value(stem).saved;
     }
 
-    // Blank texts are not written.
+    // Saves the texts that are not blank.
     void save()
     {
         pictureNeeded = true;
@@ -342,7 +342,8 @@ private:
             changeFocus(isRedo ? command.title : command.other);
             return;
         default:
-            if (command.title == canvas) // a look around may have put another title there
+            // Another title may be shown, since selecting one is not always an undo step.
+            if (command.title == canvas)
                 performOnText(command, isRedo);
             save();
         }
@@ -378,6 +379,6 @@ private:
     }
 
     QList<Command> mCommands;
-    qsizetype mIndex = 0; // of the next command to redo
-    qsizetype mClean = 0; // -1 when it was dropped
+    qsizetype mIndex = 0; // index of the next command to redo
+    qsizetype mClean = 0; // -1 when the clean state was dropped
 };

@@ -1,5 +1,3 @@
-// Two fingers that touch a program one event at a time, at random but seeded, so that a run can be repeated.
-// Where they go down, where they leap to and what happens between touches is the subclass's.
 #pragma once
 
 #include <QApplication>
@@ -16,6 +14,8 @@
 #include <qpa/qwindowsysteminterface.h>
 #include <tuple>
 
+// Two fingers that send random touch events one at a time, from a seed, so that a run can be repeated. The
+// subclass decides where they go down and jump to, and what happens between touches.
 class MonkeyFingers
 {
 public:
@@ -24,12 +24,12 @@ public:
 
     int touches() const { return m_touches; }
     bool isTouching() const { return m_fingers[0].down || m_fingers[1].down; }
-    // What the last touches were, for the report of a failure.
+    // Returns the last touches for the report of a failure.
     QStringList lastTouches() const { return m_last; }
-    // Of all touches; the same for the same course.
+    // Returns a checksum of all touches, which is the same for the same sequence.
     quint32 checksum() const { return m_checksum; }
 
-    // One touch event, and now and then what happens between touches.
+    // Sends one touch event or calls betweenTouches().
     void act()
     {
         if (!m_fingers[0].down) {
@@ -59,19 +59,19 @@ private:
     struct Finger {
         bool down = false;
         int id = 0;
-        QPoint point; // of the touched window
+        QPoint point; // in coordinates of the touched window
     };
 
 protected:
     struct Aim {
         QWidget* window = nullptr;
-        QPoint point; // of the window
+        QPoint point; // in coordinates of the window
     };
 
     virtual void betweenTouches() = 0;
-    // Where the first finger goes down; none without a window.
+    // Returns where the first finger goes down; without a window it does not.
     virtual Aim aim() = 0;
-    // Where another finger goes down, and where one leaps to.
+    // Returns where the second finger goes down, or where a finger jumps to.
     virtual QPoint pointOf(QWidget* window) = 0;
 
     int below(int limit) { return m_random.bounded(limit); }
@@ -85,7 +85,7 @@ protected:
         return list.at(below(int(list.size())));
     }
 
-    // Windows that are open beside the one: popups, dialogs, balloons; always in the same order.
+    // Returns the other open windows (popups, dialogs, balloons), always in the same order.
     static QWidgetList windowsBeside(const QWidget* main)
     {
         QWidgetList windows = QApplication::topLevelWidgets();
@@ -111,8 +111,9 @@ protected:
         m_fingers[0] = {true, ++m_lastId, aimed.point};
         send(0, QEventPoint::Pressed);
     }
-    // Without the first finger the second goes on as the first. What a release opens may run a loop of its
-    // own in which other touches come: those find no finger down.
+    // Releases one finger. When the first one is released, the second is released, too. The state is changed
+    // before the events are sent, since a release may run an event loop with further touches, which must find
+    // no finger down.
     void releaseOne()
     {
         const int index = m_fingers[1].down && (!m_fingers[0].down || below(2) == 0) ? 1 : 0;
@@ -157,7 +158,7 @@ private:
     {
         const int index = m_fingers[1].down && below(2) == 0 ? 1 : 0;
         Finger& finger = m_fingers[size_t(index)];
-        // Small steps as a finger makes them, and leaps.
+        // Mostly small steps, like a real finger, and some jumps.
         finger.point = below(5) == 0 && touchedIsOpen() ? pointOf(m_touched) : near(finger.point);
         send(index, QEventPoint::Updated);
     }
@@ -183,7 +184,7 @@ private:
     void send(QWidget* touched, const Finger& finger, const Finger& other, QEventPoint::State state)
     {
         ++m_touches;
-        // A window may close under its fingers: what is left to them is to go up.
+        // A window may close while fingers are on it: then they are only released.
         if (!isOpen(touched)) {
             note(QStringLiteral("the window has closed under the finger"));
             m_fingers = {};
@@ -222,5 +223,5 @@ private:
     int m_touches = 0;
     int m_lastId = 0;
     quint32 m_checksum = 2166136261U;
-    bool m_trace = qEnvironmentVariableIsSet("TITLER_TRACE"); // tells each touch as it comes
+    bool m_trace = qEnvironmentVariableIsSet("TITLER_TRACE"); // whether to print each touch when it is sent
 };

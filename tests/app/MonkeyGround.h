@@ -1,5 +1,3 @@
-// What the monkeys of this folder stand on: the numbers that a run takes from the environment, an application
-// whose clock stands still, a place for the data, and who holds the touch.
 #pragma once
 
 #include "app/APPEventFilter.h"
@@ -16,7 +14,8 @@
 #include <QTest>
 #include <cstdio>
 
-// The hidden window of the program, as it is when it waits for requests. The caller deletes it.
+// Returns the hidden window of the program in the state in which it waits for requests. The caller deletes
+// it.
 inline TitlerWindow* makeWaitingWindow()
 {
     APPEventFilter::instance();
@@ -24,11 +23,13 @@ inline TitlerWindow* makeWaitingWindow()
     Q_INIT_RESOURCE(TitlerToolResource);
     pMainWindow = new TitlerWindow(true, nullptr);
     pMainWindow->setRealClose(false);
-    EarlyRequests::clearInstance(); // requests would wait for client ids, which no sibling of these tests
-                                    // gives
+    // Requests would wait for client ids, which the siblings of these tests do not give.
+    EarlyRequests::clearInstance();
     return pMainWindow;
 }
 
+// Shared parts of the random tests in this folder: numbers from the environment, an application whose timers
+// can be stopped, a folder for the data, and a report of the touch locks.
 namespace MonkeyGround
 {
 
@@ -39,8 +40,7 @@ inline int number(const char* variable, int otherwise)
     return ok && value > 0 ? value : otherwise;
 }
 
-// An application whose timers stand still when told to, so that a run does not depend on the speed of the
-// machine.
+// An application whose timers can be stopped, so that a run does not depend on the speed of the machine.
 class Application : public QApplication
 {
 public:
@@ -62,7 +62,7 @@ public:
 template <class Test>
 int run(int argc, char** argv)
 {
-    // A long run is bounded by who started it.
+    // The limit for a long run is set by its caller.
     if (!qEnvironmentVariableIsSet("QTEST_FUNCTION_TIMEOUT"))
         qputenv("QTEST_FUNCTION_TIMEOUT", "7200000");
     KSInputContext::install();
@@ -71,19 +71,20 @@ int run(int argc, char** argv)
     return QTest::qExec(&test, argc, argv);
 }
 
-// Every step saves the title; in memory that does not wait for a disk.
+// Returns a folder in memory if possible: every step saves the title, which would otherwise wait for the
+// disk.
 inline QString dataFolder()
 {
     const QString memory = QStringLiteral("/dev/shm");
     return QFileInfo(memory).isWritable() ? memory : QDir::tempPath();
 }
 
-// Put before a fixture that asks where temporary folders are.
+// Sets the folder for temporary files. Declare it before a fixture that uses one.
 struct DataInMemory {
     DataInMemory() { qputenv("TMPDIR", dataFolder().toLocal8Bit()); }
 };
 
-// A line for every save would be all that is to be seen.
+// Hides the log lines for saving, which would fill the output.
 inline void showErrorsOnly()
 {
     qInstallMessageHandler([](QtMsgType type, const QMessageLogContext&, const QString& text) {
@@ -92,10 +93,11 @@ inline void showErrorsOnly()
     });
 }
 
-// Who holds the touch; empty when nobody does.
+// Returns the objects that hold a touch lock; empty when there are none.
 inline QString heldLocks()
 {
-    // The gate frees what is left once the widgets have had their turn.
+    // The event filter releases remaining locks in a posted call, after the widgets have handled their
+    // events.
     QCoreApplication::sendPostedEvents(APPEventFilter::instance(), QEvent::MetaCall);
     QStringList held;
     const auto locks = APPEventFilter::instance()->activateLockObjects();

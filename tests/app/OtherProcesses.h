@@ -1,5 +1,3 @@
-// What the other processes of the appliance do while the operator works, each time with what belongs to it on
-// disk: the file manager, the message boxes, the languages and the masks over the window. Counts what it did.
 #pragma once
 
 #include "../library/TemplateFixture.h"
@@ -17,6 +15,8 @@
 
 using Counts = QMap<QString, int>;
 
+// Random actions of the other processes of the appliance while the operator works, including their changes on
+// the disk: file manager, message boxes, languages and masks over the window. Counts the actions.
 class OtherProcesses
 {
 public:
@@ -26,7 +26,7 @@ public:
     {
     }
 
-    // Names for folders and templates; some that folders may not have.
+    // Returns a random name for folders and templates; some are not allowed for folders.
     QString anyName()
     {
         static const QStringList names{QStringLiteral("News"),
@@ -50,7 +50,7 @@ public:
         return QDir(m_files.titleRoot()).entryList(QDir::Dirs | QDir::NoDotAndDotDot, QDir::Name);
     }
 
-    // One thing that one of them does. The folder is the one that is open here, or empty.
+    // Carries out one random action. openFolder: the folder that is open in the window, or empty.
     void act(const QString& openFolder)
     {
         const int kind = below(100);
@@ -72,7 +72,7 @@ public:
             pressElsewhere();
     }
 
-    // Boxes that were asked for come up over a mask; one that is up is answered sooner or later.
+    // Shows a mask for a requested message box, and answers the box after a random number of calls.
     void serveMessages()
     {
         takeMessages();
@@ -97,7 +97,8 @@ private:
     static EditTitlerController* fileManager() { return EditTitlerController::getInstance(); }
     QString path(const QString& folder) const { return m_files.titleRoot() + QLatin1Char('/') + folder; }
 
-    // A call behind all others tells when those have arrived.
+    // Reads the requested message boxes. Sends another call first and waits for it, so that all earlier ones
+    // have arrived.
     void takeMessages()
     {
         using Proxy = MessageCenterRemoteProxy;
@@ -137,7 +138,7 @@ private:
                 return name;
         }
     }
-    // Gives a folder of the root another name on disk: both, or nothing.
+    // Renames a folder of the root on the disk. Returns the old and the new name, or nothing if that failed.
     QStringList renameOneOf(const QString& root, const QStringList& names)
     {
         if (names.isEmpty())
@@ -155,8 +156,8 @@ private:
         fileManager()->updateFolderNameInCurrentProjectNotify(
             {1, path(renamed.first()).toStdWString(), path(renamed.last()).toStdWString()});
     }
-    // It leaves the open folder alone, but for an operator who is quicker than its look, and what is nearly
-    // full.
+    // Deletes a folder. Spares folders that are nearly full and mostly the open one: the file manager checks
+    // which is open, but the operator may open another one meanwhile.
     void deleteFolder(const QString& openFolder)
     {
         const QStringList names = folders();
@@ -176,7 +177,7 @@ private:
     {
         return QDir(m_files.userRoot()).entryList(QDir::Dirs | QDir::NoDotAndDotDot, QDir::Name);
     }
-    // Now and then over one of that name.
+    // Imports a template, sometimes one with an existing name.
     void importTemplate()
     {
         const QStringList names = templates();
@@ -235,7 +236,7 @@ private:
         m_dialogMask = 1 + below(6);
         messages()->showDialogOpacityWidget();
     }
-    // What closes by itself here when another process is touched.
+    // Reports a press in another process, which closes transient controls here.
     void pressElsewhere()
     {
         count("presses in other processes");
@@ -253,7 +254,7 @@ private:
     TitleAccount& m_account;
     Counts& m_counts;
     QRandomGenerator m_random;
-    QList<int> m_boxes; // by their numbers, the one that is up first
+    QList<int> m_boxes; // message ids, that of the visible box first
     bool m_boxIsUp = false;
-    int m_dialogMask = 0; // touches that it stays
+    int m_dialogMask = 0; // number of calls until the mask is hidden
 };

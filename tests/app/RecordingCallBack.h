@@ -1,4 +1,3 @@
-// The asker's side of a create session: what it is answered.
 #pragma once
 
 #include "app/EditContextController.h"
@@ -29,7 +28,8 @@ struct Answers {
     QStringList paths;
 };
 
-// What the context takes over; the answers outlive it.
+// The callback of a process that asks for a create session. The context owns it; the answers are stored
+// outside and outlive it.
 class RecordingCallBack : public ITitlerCallBack
 {
 public:

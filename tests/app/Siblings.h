@@ -1,5 +1,3 @@
-// The two sibling processes as this program needs them: they accept connections, take every call and remember
-// which methods of which services were called. They never answer.
 #pragma once
 
 #include "messaging/ptc/Event.h"
@@ -18,10 +16,12 @@ struct SiblingCall {
     QByteArray data;
 };
 
+// The two sibling processes as far as this program needs them: they accept connections and calls, and record
+// which methods of which services were called. They never answer.
 class Siblings
 {
 public:
-    // Sets the port offset of this process to one whose ports are free.
+    // Sets the port offset of this process to one whose ports are free, and listens there.
     bool listenOnFreePorts()
     {
         for (int i = 0; i < OFFSETS_TRIED; ++i) {
@@ -40,7 +40,7 @@ public:
         return false;
     }
 
-    // The method ids called of the service, in their order.
+    // Returns the method ids called on the service, in their order.
     QList<long> methodsOf(long service) const
     {
         const std::lock_guard lock(mMutex);
@@ -54,7 +54,7 @@ public:
 
     qsizetype countOf(long service, long method) const { return methodsOf(service).count(method); }
 
-    // Packed arguments of the last call of the method; empty when it was not called.
+    // Returns the packed arguments of the last call of the method; empty when it was not called.
     QByteArray lastArguments(long service, long method) const
     {
         const std::lock_guard lock(mMutex);
@@ -65,7 +65,7 @@ public:
         return {};
     }
 
-    // Packed arguments of every call of the method, in their order.
+    // Returns the packed arguments of every call of the method, in their order.
     QList<QByteArray> argumentsOf(long service, long method) const
     {
         const std::lock_guard lock(mMutex);
@@ -84,7 +84,7 @@ public:
     }
 
 private:
-    static constexpr int FIRST_OFFSET = 10000; // below the ports that the system gives to clients
+    static constexpr int FIRST_OFFSET = 10000; // below the ports that the system assigns to clients
     static constexpr int OFFSET_STEP = 10;
     static constexpr int OFFSETS = 1900;
     static constexpr int OFFSETS_TRIED = 20;

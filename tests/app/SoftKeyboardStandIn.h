@@ -1,4 +1,3 @@
-// The soft keyboard service of the monkeys: knows whether it is up, and answers as the service does.
 #pragma once
 
 #include "messaging/services/ISoftKeyBoardController.h"
@@ -7,15 +6,18 @@
 #include <QEvent>
 #include <QString>
 
+// A soft keyboard service for the random tests: keeps whether the keyboard is shown, and answers as the real
+// service does.
 class SoftKeyboardStandIn : public ISoftKeyBoardController
 {
 public:
     bool isUp() const { return m_up; }
-    // Of a folder's name or a number, not of a text on the canvas.
+    // Returns whether the field is a single line for a folder's name or a number, and not a text on the
+    // canvas.
     bool isForLine() const { return m_field.fieldKind == 1; }
     int limits() const { return m_limits; }
 
-    // What the service tells on its own, sooner or later, about having closed.
+    // Sends the notice that the keyboard has closed, which the service sends with a delay.
     void settle()
     {
         if (!m_tellClosed)
@@ -24,7 +26,7 @@ public:
         context()->sendSoftKeyboardState(false);
     }
 
-    // The operator types on it and presses Enter.
+    // Types the text and presses Enter.
     void typeLine(const QString& text)
     {
         for (qsizetype length = 1; length <= text.size(); length += 5)
@@ -47,7 +49,7 @@ public:
     {
         context()->sendInputStringSelectionPos({begin, end, end, mode});
     }
-    // With its own key.
+    // Closes the keyboard with its own key.
     void putAway()
     {
         SubCommonDefine::tagSoftKeyBoardKeyData data;

@@ -1,5 +1,3 @@
-// Keeps account of the title folders on disk: folders are known by what they are to the file system, so that
-// one with a new name is the same; a title may go only after somebody has said so.
 #pragma once
 
 #include "../library/TemplateFixture.h"
@@ -10,6 +8,8 @@
 #include <QSet>
 #include <sys/stat.h>
 
+// Checks the title folders on the disk for lost titles. Folders are identified by inode, so a renamed folder
+// is the same one. A title may only be missing after titleMayGo() or folderGoes().
 class TitleAccount
 {
 public:
@@ -31,7 +31,8 @@ public:
         m_mayGo.remove(inodeOf(folder));
     }
 
-    // What has been lost since the last look, and what cannot be read; empty when all is well.
+    // Returns what was lost since the last call and which files cannot be read; empty when there are no
+    // problems.
     QString look(bool withPictures)
     {
         QStringList wrong;
@@ -82,7 +83,7 @@ private:
     }
     static ino_t inodeOf(const QString& path) { return statusOf(path).st_ino; }
 
-    // Only what was written since the last time.
+    // Returns whether the file was written since the last call.
     bool isNew(const QString& path)
     {
         const struct stat status = statusOf(path);
@@ -97,12 +98,12 @@ private:
             const QString path = files.next();
             const bool isTitle = path.endsWith(QLatin1String(".xml"));
             if (isTitle && files.fileInfo().path() == root)
-                continue; // settings
+                continue; // a settings file
             if ((!isTitle && !withPictures) || !isNew(path))
                 continue;
             const bool isWhole = isTitle ? readTitle(path) : !QImage(path).isNull();
             ++(isTitle ? m_titlesRead : m_picturesRead);
-            if (!isWhole && QFile::exists(path)) // else it has just been put in the place of another
+            if (!isWhole && QFile::exists(path)) // otherwise the file has just been renamed over another one
                 wrong.append("cannot be read: " + path);
         }
     }

@@ -1,5 +1,3 @@
-// Fingers that go anywhere in the window and in all that it opens, and use the soft keyboard and the requests
-// of other processes between touches.
 #pragma once
 
 #include "CanvasFingers.h"
@@ -26,6 +24,8 @@
 #include <QPushButton>
 #include <QTabBar>
 
+// Random fingers in the window and in everything that it opens, with input of the soft keyboard and requests
+// of other processes between touches.
 class WindowFingers : public CanvasFingers
 {
 public:
@@ -44,7 +44,7 @@ public:
     {
     }
 
-    // One touch event; while a finger rests, time passes.
+    // Sends one touch event, or lets time pass while a finger rests.
     void step()
     {
         if (!isTouching()) {
@@ -62,7 +62,7 @@ public:
         act();
     }
 
-    // No finger goes down any more, even one that waits behind a dialog.
+    // Lifts all fingers and prevents further presses, even of a finger that waits for a dialog to close.
     void end()
     {
         m_isOver = true;
@@ -91,7 +91,7 @@ protected:
         else if (kind < 66 && !QApplication::activeModalWidget() && !m_others.isAsking())
             undoOrRedo();
         else if (kind < 68 && !QApplication::activeModalWidget())
-            type(); // on a keyboard with keys
+            type(); // as on a physical keyboard
     }
 
     Aim aim() override
@@ -131,8 +131,8 @@ protected:
     }
 
 private:
-    // Times in milliseconds: less than any timer that waits for the operator; what becomes a hold; and what
-    // ends all of them.
+    // Milliseconds: shorter than all timers that wait for the operator; long enough for a long press; longer
+    // than all timers.
     static constexpr int MOMENT = 60;
     static constexpr int HOLD = 800;
     static constexpr int LONG = 2500;
@@ -163,7 +163,7 @@ private:
             m_isTap = m_isTap && below(2) == 0;
             return pointOnCanvas();
         }
-        // The panel works only on a text.
+        // The panel is enabled only for a text.
         if (kind < 40 && (m_scene.itemIsEditorInteraction() || m_scene.itemIsSelectionMode()))
             return pointOnPanel(kind - 22);
         if (kind < 64)
@@ -204,16 +204,16 @@ private:
         QRect area = item->visibleRegion().boundingRect();
         if (m_window.archiveListIsMoveMode() && below(4) != 0) {
             area &= item->getDragArea();
-            m_rest = MOMENT; // lifts it
+            m_rest = MOMENT; // long enough to lift the title
             m_isTap = false;
         } else if (below(3) == 0) {
-            m_rest = HOLD; // opens the menu
+            m_rest = HOLD; // long enough to open the menu
             m_isTap = true;
         }
         return item->mapTo(&m_window, within(area));
     }
 
-    // More often on those that need one another.
+    // Returns a point on a menu row, more often on rows whose actions depend on each other.
     QPoint pointOnMenu(const KSMenu& menu)
     {
         static const QList<int> rows{0, 1, 1, 2, 2, 2, 3, 4};
@@ -235,7 +235,7 @@ private:
         if (row.isEmpty())
             return tree->viewport()->mapTo(&m_folders, within(tree->viewport()->rect()));
         if (below(3) == 0)
-            m_rest = HOLD; // renames it
+            m_rest = HOLD; // long enough to start renaming the folder
         return tree->viewport()->mapTo(&m_folders, within(row));
     }
     QPoint pointOnTemplates()
@@ -278,7 +278,7 @@ private:
         }
     }
 
-    // Often the one with most titles, whose limit is to be met.
+    // Returns a folder, often that with the most titles, so that its limit is reached.
     QString anyFolder()
     {
         const QStringList names = m_others.folders();
@@ -294,7 +294,7 @@ private:
         return folder;
     }
 
-    // Somebody asks for the window.
+    // Sends a random request to show the window.
     void request()
     {
         auto* context = EditContextController::getInstance();
@@ -334,6 +334,6 @@ private:
     ToolsBar& m_bar;
     TextToolsPanel& m_panel;
     bool m_isOver = false;
-    int m_rest = 0;       // milliseconds that the finger that is down rests first
-    bool m_isTap = false; // it goes up next
+    int m_rest = 0;       // milliseconds that the finger rests before its next event
+    bool m_isTap = false; // whether the next event is a release
 };

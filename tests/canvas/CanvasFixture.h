@@ -1,4 +1,4 @@
-// A canvas with its surroundings, for tests: view, undo stack, messages, pictures.
+// A canvas with everything it needs, for tests: view, undo stack, messages, pictures.
 #pragma once
 
 #include "CanvasTestTools.h"
@@ -75,7 +75,7 @@ private:
     RenderLog& m_log;
 };
 
-// A canvas on its view with an undo stack, as the window has it.
+// A canvas with its view and an undo stack, as in the window.
 class Canvas
 {
 public:
@@ -105,7 +105,7 @@ public:
         scene->slotUpdateArchive(&title);
     }
     GraphicsText* text(int id) const { return scene->findTextItem(id); }
-    // A point on the first character of the object, in view coordinates.
+    // Returns a point on the first character of the object, in view coordinates.
     QPoint pointOn(int id) const
     {
         const GraphicsText* item = text(id);
@@ -126,7 +126,7 @@ public:
                          Qt::LeftButton, {});
         QCoreApplication::sendEvent(view.viewport(), &move);
     }
-    // What lies in the file now.
+    // Returns the title as it is saved in the file.
     std::unique_ptr<Archive> saved() const
     {
         auto archive = std::make_unique<Archive>();

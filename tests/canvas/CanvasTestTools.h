@@ -1,4 +1,4 @@
-// Records and items for the tests of the canvas.
+// Makes records and items for the tests of the canvas.
 #pragma once
 
 #include "canvas/GraphicsText.h"
@@ -21,7 +21,8 @@ inline TextStyle makeStyle(const QString& text, const char* family = "KST", int 
     return style;
 }
 
-// One style per UTF-16 unit, as a foreign writer would make it: whole text in the first unit of a pair.
+// Returns a record as another program would write it, with one style per UTF-16 unit: the first unit of a
+// pair has the whole text.
 inline TText makeRecord(const QString& text, int id = 1, const char* family = "KST", int size = 96)
 {
     TText record;
@@ -42,7 +43,7 @@ inline TText makeRecord(const QString& text, int id = 1, const char* family = "K
     return record;
 }
 
-// A source of a style change: count copies of the style.
+// Returns the source of a style change: count copies of the style.
 inline TText makeSource(const TextStyle& style, int count)
 {
     TText source;
@@ -67,7 +68,7 @@ inline bool inStep(const GraphicsText& item)
            textOfStyles(*item.getItemTText()) == item.toPlainText();
 }
 
-// Reads a typed text back into the record, as the scene does.
+// Connects the document so that typed text is read back into the record, as the scene does.
 inline void connectDocument(GraphicsText& item)
 {
     QObject::connect(item.document(), &QTextDocument::contentsChange, &item,

@@ -1,4 +1,3 @@
-// What the units of a text object work on, without the item, the scene and Qt's own handling of events.
 #pragma once
 
 #include "canvas/CaretGeometry.h"
@@ -14,7 +13,8 @@
 #include <QTextCursor>
 #include <QTextDocument>
 
-// Keeps state as the item does, and the reports as a list of their names.
+// Replaces the item, the scene and Qt's event handling in tests of the units of a text object. Keeps the
+// state that the item would keep, and a list of the reports by name.
 class FakeTextObject : public ITextSurface, public ITextObjectListener
 {
 public:

@@ -1,4 +1,3 @@
-// An operator who does anything in any order, for tests: seeded, so that a run can be repeated.
 #pragma once
 
 #include "CanvasFixture.h"
@@ -6,6 +5,7 @@
 
 #include <QRandomGenerator>
 
+// An operator who edits at random, for tests. The same seed gives the same edits.
 class RandomEditor
 {
 public:
@@ -14,7 +14,7 @@ public:
     {
     }
 
-    // One edit, of whatever kind is possible now.
+    // Carries out one edit of a kind that is possible now.
     void edit()
     {
         switch (below(16)) {
@@ -56,7 +56,7 @@ public:
         }
     }
 
-    // Leaves what is being done, as the buttons of the window do before they undo.
+    // Ends the current edit, as the buttons of the window do before an undo.
     void leave()
     {
         if (m_canvas.scene->itemIsEditorInteraction())
@@ -73,7 +73,7 @@ private:
         const QList<GraphicsText*> texts = m_canvas.scene->getTextItemList();
         return texts.isEmpty() ? nullptr : texts.at(below(int(texts.size())));
     }
-    // Where a cursor can stand: not inside a character.
+    // Returns a position of the cursor that is not inside a surrogate pair.
     int anyPosition(const GraphicsText& item)
     {
         const int position = below(item.document()->characterCount());
@@ -186,14 +186,15 @@ private:
             item->getSelectionInfo(below(length), below(length), below(length), below(3));
         }
     }
-    // Typing becomes a step after some seconds without a key.
+    // Turns typing into an undo step, as happens after some seconds without a key.
     void silence()
     {
         const QList<GraphicsText*> texts = m_canvas.scene->getTextItemList();
         for (GraphicsText* item : texts)
             item->pushLastEditTextIntoStack();
     }
-    // What the panel would send now: the styles that are selected, with one property changed.
+    // Returns what the panel would send now: the styles of the selection, in which the caller changes one
+    // property.
     TText sent(const GraphicsText& item) const
     {
         TText source = *item.getItemTText();

@@ -1,10 +1,10 @@
-// Every property of a style change, with two values each that can be told apart, for tests.
 #pragma once
 
 #include "CanvasTestTools.h"
 
 #include <QString>
 
+// All properties of a style change, with two different values each, for tests.
 namespace StyleProperties
 {
 
@@ -14,7 +14,7 @@ inline bool isOverall(int id)
            id == TextObjectConstants::PropertyPosition;
 }
 
-// Gives the style or the record the first or second value of the property.
+// Sets the property of the style or the record to the first or second value.
 inline void set(int id, TText& source, int value)
 {
     const bool second = value != 0;
@@ -74,7 +74,7 @@ inline void set(int id, TText& source, int value)
     }
 }
 
-// What a style holds, without the text, as one line that can be compared and read.
+// Returns a style without its text as one readable line.
 inline QString describe(const TextStyle& style)
 {
     return QString("%1 %2 %3 b%4 i%5 k%6 e%7 %8 %9")
@@ -89,7 +89,7 @@ inline QString describe(const TextStyle& style)
         .arg(QString::fromStdString(style.textEdge().getEdgeColor()));
 }
 
-// The whole record, with its place.
+// Returns the whole record, including its place, as text.
 inline QString describe(const TText& record)
 {
     QString text = QString("id%1 (%2,%3,%4) align%5 shadow%6 %7,%8 %9\n")

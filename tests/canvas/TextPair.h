@@ -1,11 +1,10 @@
-// A text object of parent and child, for tests.
 #pragma once
 
 #include "CanvasTestTools.h"
 
 #include <QGraphicsScene>
 
-// A pair in a scene, read back while it is typed into.
+// A text object of parent and child in a scene, for tests. Typed text is read back into the record.
 struct Pair {
     explicit Pair(const TText& record)
     {

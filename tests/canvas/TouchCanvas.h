@@ -1,4 +1,3 @@
-// A canvas in a window that is touched by fingers through the application's gate, for tests.
 #pragma once
 
 #include "CanvasFixture.h"
@@ -11,8 +10,8 @@
 #include <QPointingDevice>
 #include <QWidget>
 
-// The canvas at the left of a window, a button to its right, and the filter that decides which of them may be
-// touched.
+// The canvas at the left of a window, with a button to its right, for tests with fingers. The application's
+// event filter decides which of them may be touched.
 class TouchCanvas : public Canvas
 {
 public:
@@ -44,7 +43,7 @@ public:
     void press(QPoint point) { touch(QEventPoint::Pressed, point); }
     void move(QPoint point) { touch(QEventPoint::Updated, point); }
     void release(QPoint point) { touch(QEventPoint::Released, point); }
-    // In steps as a finger makes them; it stays down.
+    // Presses and moves in small steps like a finger, without a release.
     void pressAndDrag(QPoint from, QPoint to)
     {
         constexpr int STEPS = 40;
@@ -52,14 +51,14 @@ public:
         for (int step = 1; step <= STEPS; ++step)
             move(from + (to - from) * step / STEPS);
     }
-    // A tap that is no part of a double tap.
+    // Taps without starting a double tap.
     void touchTap(QPoint point)
     {
         quickTap(point);
         view.mouseClick();
     }
     void quickTap(QPoint point) { tapOnce(view.viewport(), m_device, point); }
-    // The finger goes down at the first point and is still down at the second.
+    // Presses at the first point and moves to the second, without a release.
     void slide(QPoint from, QPoint to)
     {
         press(from);
@@ -77,7 +76,7 @@ public:
         release(to);
         view.mouseClick();
     }
-    // Selects the object and edits it, the cursor where it was tapped.
+    // Selects the object and starts editing, with the cursor at the point.
     void edit(int id, QPoint point)
     {
         touchTap(point);
@@ -89,7 +88,7 @@ public:
     {
         return view.mapFromScene(item.mapToScene(place));
     }
-    // The middle of the caret of a position.
+    // Returns the middle of the caret of a position.
     QPoint caretIn(GraphicsText& item, int position) const
     {
         QLineF line;
@@ -98,12 +97,12 @@ public:
         item.carets().caretPoint(line, point, block, position);
         return inView(item, line.center());
     }
-    // The middle of the character at a position.
+    // Returns the middle of the character at a position.
     QPoint characterIn(GraphicsText& item, int position) const
     {
         return (caretIn(item, position) + caretIn(item, position + 1)) / 2;
     }
-    // Top left of the handle of a position, in item coordinates.
+    // Returns the top left of the handle of a position, in item coordinates.
     static QPointF handleOf(GraphicsText& item, int position)
     {
         QLineF line;

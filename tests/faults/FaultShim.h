@@ -1,8 +1,8 @@
-// The preloaded shim as the program under it finds it; without it, nothing is counted and nothing fails.
 #pragma once
 
 #include <dlfcn.h>
 
+// Calls the functions of the preloaded fault library. Without the library they do nothing.
 namespace FaultShim
 {
 
@@ -18,7 +18,7 @@ inline void start()
         function();
 }
 
-// From here on the disk is well again.
+// Stops the faults: later file operations succeed.
 inline void stop()
 {
     if (auto* function = find<void()>("faults_stop"))
@@ -31,7 +31,7 @@ inline long count()
     return function ? function() : 0;
 }
 
-// The first operation that was made to fail; empty when none was.
+// Returns the first operation that failed on purpose; empty when none did.
 inline const char* hit()
 {
     auto* function = find<const char*()>("faults_hit");

@@ -1,5 +1,3 @@
-// What an operator has done and seen, as one JSON object a line on standard output. A line is out before the
-// next thing is done, so that it is there when the process is killed.
 #pragma once
 
 #include <QJsonArray>
@@ -10,10 +8,12 @@
 #include <QStringList>
 #include <cstdio>
 
+// The record of an operator's actions and of what the window showed, one JSON object per line on standard
+// output. Each line is written before the next action, so that it is complete when the process is killed.
 class Journal
 {
 public:
-    // The texts of the titles of a folder by the stem of their files, and their order in the list.
+    // The texts of a folder's titles by the stem of their files, and the order of the stems in the list.
     struct Folder {
         QStringList order;
         QMap<QString, QStringList> texts;

@@ -1,9 +1,3 @@
-// An operator's day on the real window, without a screen: a folder is opened, titles are edited, copied,
-// pasted, made, deleted, moved and saved as templates, folders are made, copied and renamed, and all is
-// closed. Siblings stand in for the other processes. What the operator saw after each step goes into the
-// journal.
-//
-// Needs a QApplication and KSInputContext::install before it. GUI thread.
 #pragma once
 
 #include "../app/Siblings.h"
@@ -21,32 +15,39 @@ class GraphicsText;
 class TemplatePicker;
 class TitlerWindow;
 
+// A long session of an operator in the real window, without a screen: a folder is opened; titles are edited,
+// copied, pasted, created, deleted, moved and saved as templates; folders are created, copied and renamed;
+// everything is closed. Siblings replaces the other processes. After each step the journal gets what the
+// operator sees.
+//
+// Needs a QApplication, and KSInputContext::install() before it. GUI thread.
 class OperatorSession : public QObject
 {
     Q_OBJECT
 
 public:
-    static const QString FOLDER;      // the one that is there
-    static const QString MADE_FOLDER; // made in the session, and its later name
+    static const QString FOLDER;      // exists at the start
+    static const QString MADE_FOLDER; // created in the session; its later name follows
     static const QString RENAMED_FOLDER;
     static const QString COPIED_FOLDER;
-    static const QStringList STEMS;   // of the titles that are there
-    static const QString PRESET_TEXT; // what the titles of the templates say
+    static const QStringList STEMS;   // of the titles that exist at the start
+    static const QString PRESET_TEXT; // texts of the titles in the templates
     static const QString USER_TEXT;
 
-    // titleRoot is the folder of the title folders. False from isReady when no ports are free.
+    // titleRoot: the folder that contains the title folders. isReady() returns false when no ports are free.
     explicit OperatorSession(const QString& titleRoot);
     ~OperatorSession() override;
     bool isReady() const { return mWindow != nullptr; }
 
-    // Writes a first text into each title, so that it gets its pictures.
+    // Types a first text into each title, so that its pictures are made.
     void makePictures();
-    // The session. With healBeforeClose the faults end before each Close.
+    // Runs the session. With healBeforeClose the faults are stopped before each Close.
     void play(bool healBeforeClose);
-    // Opens every folder, looks at every title and closes.
+    // Opens every folder, shows every title and closes.
     void look();
-    // So many sessions one after the other: the folder is opened, two titles edited, one pasted and deleted,
-    // and all is closed. Memory, descriptors and threads in use go into the journal now and then.
+    // Runs this number of short sessions: the folder is opened, two titles are edited, one is pasted and
+    // deleted, and everything is closed. Writes memory, descriptors and threads in use to the journal at
+    // intervals.
     void soak(int sessions);
     void end();
 
@@ -71,7 +72,7 @@ private:
     void makeFolder(const QString& name);
     void nameFolder(const QString& name);
     QModelIndex rowOf(const QString& folder) const;
-    // Makes what a new title of the open folder says known, in case there is one.
+    // Adds the texts of a new title of the open folder to mKnown, if there is one.
     void noteNewTitle(const QStringList& before, const QStringList& texts);
     Journal::Folders withTexts(const QString& stem, const QStringList& texts) const;
 
@@ -87,6 +88,6 @@ private:
     std::function<void()> mInFolders;
     std::function<void()> mInTemplates;
     QString mOpen;           // name of the open folder
-    bool mIsSlow = false;    // something was not saved in time
-    Journal::Folders mKnown; // as the operator has seen them last
+    bool mIsSlow = false;    // whether something was not saved in time
+    Journal::Folders mKnown; // as last seen by the operator
 };

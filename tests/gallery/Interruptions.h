@@ -1,6 +1,3 @@
-// Fingers that are interrupted: every widget that takes touches is pressed, held, flicked, carried and
-// edited, and a lock, the watchdog, hiding, disabling or destruction comes between. Nothing may follow from
-// such a touch, and a tap must work afterwards.
 #pragma once
 
 #include "SignalLog.h"
@@ -23,6 +20,9 @@
 #include <functional>
 #include <tuple>
 
+// Tests of interrupted touches: each widget that accepts touches is pressed, held, flicked, dragged or
+// edited, and interrupted by a lock, the watchdog, hiding, disabling or destruction. The interrupted touch
+// must have no effect, and a tap must work afterwards.
 class Interruptions
 {
 public:
@@ -33,14 +33,14 @@ public:
 
     explicit Interruptions(ManualClock& clock) : m_clock(clock) { APPEventFilter::instance(); }
 
-    // Brings what is tested into its first state.
+    // Brings the widgets into their initial state.
     std::function<void()> restore = [] {};
-    // Which of the visible widgets are tested.
+    // Returns whether a visible widget is tested.
     std::function<bool(const QWidget*)> concerns = [](const QWidget*) { return true; };
-    // Destroys the widget; without it nothing is destroyed.
+    // Destroys the widget; while not set, destruction is not tested.
     std::function<void(QWidget*)> destroy;
 
-    // One name for each kind of widget that takes touches and that a tap makes emit something.
+    // Returns one name for each kind of widget that accepts touches and emits a signal when tapped.
     QStringList kinds()
     {
         QStringList result;
@@ -60,7 +60,7 @@ public:
         return result;
     }
 
-    // What is wrong with the widget of this name, a line each.
+    // Tests the widget of this name. Returns one line for each problem.
     QStringList problems(const QString& name)
     {
         restore();
@@ -122,14 +122,14 @@ private:
         }
         return result;
     }
-    // Where a finger finds this widget and nothing that lies on it; null when there is no such place.
+    // Returns a place where a touch reaches this widget and no other one; null when there is none.
     static QPoint placeOn(const QWidget* widget)
     {
         const QRect area = widget->visibleRegion().boundingRect();
         const auto* row = qobject_cast<const KSBaseItemWidget*>(widget);
         QList<QPoint> places{area.center()};
         if (const auto* menu = qobject_cast<const KSMenu*>(widget))
-            places.prepend(menu->getMenuItemRect(1).center()); // enabled, in all menus
+            places.prepend(menu->getMenuItemRect(1).center()); // this row is enabled in all menus
         if (row != nullptr && row->hasDragFlag() && !row->getDragArea().isNull())
             places.prepend(row->getDragArea().center());
         for (const int part : {1, 3, 5, 7})
@@ -166,7 +166,7 @@ private:
         }
         return nullptr;
     }
-    // A press beside an open popup would only close it.
+    // Closes the other popups, since a press outside an open popup would only close it.
     static void closePopupsBeside(const QWidget* widget)
     {
         for (QWidget* window : windows()) {
@@ -197,12 +197,12 @@ private:
         touch(widget);
         m_fingers.lift(0);
     }
-    // What the widget and those around it emit when it is tapped.
+    // Taps the widget and returns the signals that it and its ancestors emit.
     QStringList answerOf(QWidget* widget)
     {
         closePopupsBeside(widget);
         if (auto* edit = qobject_cast<QLineEdit*>(widget))
-            edit->setCursorPosition(0); // away from where the finger is
+            edit->setCursorPosition(0); // moved away, so that the tap changes the cursor position
         const QPointer<QWidget> kept = widget;
         SignalLog log;
         touch(widget);
@@ -292,7 +292,7 @@ private:
             return {QStringLiteral("it is not there")};
         closePopupsBeside(widget);
         begin(widget, phase);
-        if (widget == nullptr || !widget->isVisible()) { // its tap has closed it
+        if (widget == nullptr || !widget->isVisible()) { // the tap has closed it
             m_fingers.liftAll();
             return {};
         }
@@ -333,8 +333,8 @@ private:
         if (widget == nullptr || !widget->isVisible())
             return result + QStringList(QStringLiteral("it is not there afterwards"));
         const QStringList now = answerOf(widget);
-        // What a place on a slider does depends on where its handle is now, that on the ground of a list on
-        // how far the list has been scrolled.
+        // The effect of a tap on a slider depends on the place of its handle, that of a tap in a list on how
+        // far it is scrolled.
         const bool isMovable = qobject_cast<const QAbstractSlider*>(widget) != nullptr ||
                                qobject_cast<const QAbstractScrollArea*>(widget->parentWidget()) != nullptr;
         const bool answers = std::any_of(now.cbegin(), now.cend(), [&](const QString& signal) {

@@ -1,4 +1,3 @@
-// Notes every signal that widgets emit, whether somebody is connected or not.
 #pragma once
 
 #include <QByteArray>
@@ -10,6 +9,7 @@
 #include <private/qobject_p.h>
 #include <utility>
 
+// Records every signal that widgets emit, whether it is connected or not.
 class SignalLog
 {
 public:
@@ -27,8 +27,8 @@ public:
     SignalLog(const SignalLog&) = delete;
     SignalLog& operator=(const SignalLog&) = delete;
 
-    // "name" of each signal since the last call, once, of this widget and those around it; of all widgets
-    // without one.
+    // Returns the names of the signals since the last call, each once: those of this widget and its
+    // ancestors, or of all widgets for null.
     QStringList take(const QWidget* of = nullptr)
     {
         QStringList names;

@@ -1,5 +1,3 @@
-// The folder picker over a window, under a finger on a touch screen, with a soft keyboard service that
-// records what it is told. Programs that use it call KSInputContext::install() before QApplication.
 #pragma once
 
 #include "LibraryFixture.h"
@@ -19,12 +17,14 @@
 #include <QSignalSpy>
 #include <memory>
 
+// The folder picker above a window, with fingers of a touch screen and a soft keyboard service that records
+// its calls. Programs that use it call KSInputContext::install() before QApplication.
 class FolderPickerFixture
 {
 public:
     static constexpr int HOLD = 30; // milliseconds
 
-    // Empties the disk and opens nothing yet.
+    // Removes all folders; opens nothing yet.
     void reset()
     {
         close();
@@ -37,7 +37,7 @@ public:
         context.createNew = false;
     }
 
-    // What is on the disk by now is listed.
+    // Opens the dialog with the folders that are on the disk.
     void open()
     {
         touch = std::make_unique<TouchFixture>();
@@ -111,7 +111,7 @@ public:
 
     // --- Fingers
 
-    // The window is told by the fixture: the dialog is larger than the screen of a test.
+    // Taps in coordinates of the picker, since the dialog is larger than the screen of a test.
     void tap(const QWidget* widget, const QPoint& point) const
     {
         touch->tap(picker.get(), widget->mapTo(picker.get(), point));
@@ -143,7 +143,8 @@ public:
     {
         return picker->findChild<KSPushbutton*>(QLatin1String(name));
     }
-    // Of Duplicate, New Folder, Open and Cancel: one sign each, "-" for one that cannot be pressed.
+    // Returns the state of Duplicate, New Folder, Open and Cancel, one character each: "+" enabled, "-"
+    // disabled.
     QString buttons() const
     {
         QString states;
@@ -161,13 +162,13 @@ public:
         input()->sendKey(keyRecord(QEvent::KeyPress, Qt::Key_Enter));
         QCoreApplication::processEvents();
     }
-    // As the keyboard does: the text whole, then the key.
+    // Enters a name as the soft keyboard does: the whole text, then the key.
     void enter(const QString& name) const
     {
         input()->sendInputStringOnEnterPressing(name.toStdWString());
         enter();
     }
-    // Keys of a physical keyboard go to the service, too, and come back from it.
+    // Types on a physical keyboard, whose keys also go to the service and come back from it.
     void type(const QString& text) const
     {
         for (const QChar sign : text)
@@ -179,7 +180,7 @@ public:
         input()->sendKey(keyRecord(QEvent::KeyPress, Qt::Key_Escape));
         QCoreApplication::processEvents();
     }
-    // The codes of the limit messages since the last call.
+    // Returns the codes of the limit messages since the last call.
     QList<int> limits() const
     {
         QList<int> codes;
@@ -187,7 +188,7 @@ public:
             codes.append(info.code);
         return codes;
     }
-    // The box that tells of a name in use was answered.
+    // Answers the message about a name in use.
     void answerClash() const
     {
         MessageDefine::tagCloseParam param;

@@ -1,4 +1,3 @@
-// Stands in for the file manager's link, and holds the picture thread at the end of each job.
 #pragma once
 
 #include "document/ITitleChangeReporter.h"
@@ -6,6 +5,7 @@
 #include <QSemaphore>
 #include <QString>
 
+// Replaces the link to the file manager and blocks the picture thread at the end of each job.
 class HoldingReporter : public ITitleChangeReporter
 {
 public:
@@ -15,11 +15,11 @@ public:
     void changeTitlerStatus(FileManagerDefine::emTITLECHANGE_TYPE type, QString) override
     {
         if (type != FileManagerDefine::TITLE_PICTURES_CHANGED)
-            return; // of the GUI thread
+            return; // sent by the GUI thread, which must not be blocked
         reached.release();
         goOn.acquire();
     }
 
-    QSemaphore reached; // the files of a job are written
-    QSemaphore goOn;    // released by the test, once a job
+    QSemaphore reached; // released when the files of a job are written
+    QSemaphore goOn;    // released by the test, once per job
 };

@@ -1,4 +1,5 @@
-// A data path of its own with title folders, and recorders for what the title library reports.
+// A data path for one test program, with title folders and with recorders for the reports of the title
+// library.
 #pragma once
 
 #include "canvas/MessageBoxController.h"
@@ -24,7 +25,7 @@
 #include <string>
 #include <vector>
 
-// Lives as long as the test program: the paths are read from the environment once.
+// Make one that exists as long as the test program, since the paths are read from the environment only once.
 class LibraryFixture
 {
 public:
@@ -45,7 +46,7 @@ public:
         checker().save(base + QStringLiteral("resources/Templates/checker_240x135.png"));
     }
 
-    // What lies under the small pictures.
+    // Returns the checker pattern behind the small pictures.
     static QImage checker()
     {
         QImage image(240, 135, QImage::Format_RGB32);
@@ -67,7 +68,7 @@ public:
         return path;
     }
 
-    // One text object, styled character by character.
+    // Makes a text object with one style per character.
     static TText* makeText(const QString& text, int id, float x = 100, float y = 100)
     {
         auto* record = new TText;
@@ -86,7 +87,7 @@ public:
         return record;
     }
 
-    // The record of a title of this stem, with one text object that shows the text.
+    // Returns the record of a title with this stem and one text object with the text.
     static std::unique_ptr<Archive> makeRecord(const QString& folder, const QString& stem,
                                                const QString& text)
     {
@@ -102,8 +103,8 @@ public:
         return archive;
     }
 
-    // Writes title files of these stems, each showing its stem as text, with a red picture in place of each
-    // of the four, and an order file.
+    // Writes title files with these stems, each with its stem as text and a red picture for each of the four,
+    // and an order file.
     static void fillFolder(const QString& folder, const QStringList& stems)
     {
         ArchiveController controller;
@@ -133,7 +134,7 @@ public:
         qDeleteAll(rows);
     }
 
-    // Stems in the order file.
+    // Returns the stems in the order file.
     static QStringList order(const QString& folder)
     {
         ArchiveController controller;

@@ -1,4 +1,3 @@
-// Template folders beside the title folders of LibraryFixture.
 #pragma once
 
 #include "LibraryFixture.h"
@@ -10,6 +9,7 @@
 
 #include <QDateTime>
 
+// Template folders in addition to the title folders of LibraryFixture.
 class TemplateFixture : public LibraryFixture
 {
 public:
@@ -20,7 +20,7 @@ public:
         return userRoot() + QLatin1Char('/') + name + QStringLiteral("/Titler.xml");
     }
 
-    // Empties both and forgets what was read from them.
+    // Removes the templates from both folders and resets the managers that have read them.
     void resetTemplates()
     {
         FileSyncQueue::flush(std::chrono::seconds(30));
@@ -35,7 +35,7 @@ public:
         mAge = 0;
     }
 
-    // Presets with these stems, as the only ones of the set.
+    // Makes presets with these stems, the only ones listed in the order file of the set.
     void makePresets(const QString& set, const QStringList& stems, bool hasBackground = false) const
     {
         const QString folder = presetRoot() + QLatin1Char('/') + set;
@@ -55,7 +55,7 @@ public:
         writeOrder(folder, stems);
     }
 
-    // Younger than all made before. Takes its place at the next start of the manager.
+    // Makes a user template that is newer than the previous ones. The manager lists it after its next start.
     void makeUserTemplate(const QString& name, const QStringList& texts = {QStringLiteral("text")})
     {
         const QString folder = userRoot() + QLatin1Char('/') + name;
@@ -90,7 +90,7 @@ public:
             picture(Qt::green).save(folder + QLatin1String(file));
     }
 
-    // Names in the order file of the user templates.
+    // Returns the names in the order file of the user templates.
     QStringList userOrder() const
     {
         ArchiveController controller;

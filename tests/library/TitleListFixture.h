@@ -1,5 +1,3 @@
-// The title list in a window with the application's filter before it, fingers from a touch screen, a clock to
-// drive and an undo stack that takes its commands.
 #pragma once
 
 #include "LibraryFixture.h"
@@ -20,16 +18,18 @@
 #include <QUndoStack>
 #include <QWidget>
 
+// The title list in a window with the application's event filter, fingers of a touch screen, a clock that the
+// test advances, and an undo stack for the commands of the list.
 class TitleListFixture : public QObject
 {
 public:
-    static constexpr int ROW = 143;             // with the gap
+    static constexpr int ROW = 143;             // height with the gap
     static constexpr int HANDLE_X = 523;        // in list coordinates
-    static constexpr int PICTURE_X = 150;       // likewise, on a title's picture
-    static constexpr int TEXT_X = 400;          // and on its text
+    static constexpr int PICTURE_X = 150;       // in list coordinates; on the picture of a title
+    static constexpr int TEXT_X = 400;          // in list coordinates; on the text of a title
     static constexpr int HOLD_TIME = 700;       // ms
     static constexpr int LIFT_TIME = 50;        // ms
-    static constexpr int TICK = 33;             // ms, of a flick
+    static constexpr int TICK = 33;             // ms between two steps of a flick
     static constexpr int EDGE_SCROLL_TIME = 40; // ms
 
     explicit TitleListFixture(QPointingDevice* device) : mDevice(device)
@@ -73,7 +73,7 @@ public:
         canvas.clear();
     }
 
-    // Fingers, in coordinates of the list.
+    // Fingers in list coordinates
     void press(int x, int y, int finger = 0) { touch().press(finger, QPoint(x, y), list); }
     void move(int x, int y, int finger = 0) { touch().move(finger, QPoint(x, y), list); }
     void release(int x, int y, int finger = 0) { touch().release(finger, QPoint(x, y), list); }
@@ -89,7 +89,7 @@ public:
         clock.advance(HOLD_TIME);
         release(x, y);
     }
-    // A steady motion with a tick of the flick after each step.
+    // Moves the finger at constant speed, with one step of the flick timer after each step.
     void drag(int x, int fromY, int toY, int steps)
     {
         for (int i = 1; i <= steps; ++i) {
@@ -113,7 +113,7 @@ public:
     }
 
     ArchiveMenu* menu() const { return list->findChild<ArchiveMenu*>(); }
-    // A finger on an entry of the open menu.
+    // Taps an entry of the open menu.
     void choose(ArchiveAction::ARCHIVE_ACTION_TYPE type)
     {
         ArchiveMenu* open = menu();
@@ -141,12 +141,12 @@ public:
     bool isLocked() const { return !const_cast<KSAppEventFilter&>(mFilter).activateLockObjects().isEmpty(); }
     QStringList takeCanvas() { return std::exchange(canvas, {}); }
 
-    ManualClock clock; // before all widgets
+    ManualClock clock; // declared before all widgets, which use it
     KSAppEventFilter mFilter;
     QUndoStack stack;
     QLabel label;
     QWidget window;
-    ArchiveList* list = nullptr; // the window's
+    ArchiveList* list = nullptr; // owned by window
     QStringList canvas;          // stems sent to the canvas; "null" for none
 
 private:

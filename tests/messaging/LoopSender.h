@@ -1,4 +1,3 @@
-// Feeds what is sent straight into a receiver, as the socket would.
 #pragma once
 
 #include "messaging/ptc/Event.h"
@@ -8,6 +7,7 @@
 #include <cstring>
 #include <memory>
 
+// Passes sent events directly to a receiver, as the socket would.
 class LoopSender : public PTC::ISender
 {
 public:
@@ -19,7 +19,7 @@ public:
         const std::unique_ptr<PTC::Event> owner(event);
         lastSize = event->getSize();
         if (event->getSize() <= 0) {
-            return; // the transport drops it
+            return; // the socket would drop it
         }
         char* data = new char[static_cast<std::size_t>(event->getSize())];
         std::memcpy(data, event->getData(), static_cast<std::size_t>(event->getSize()));

@@ -1,4 +1,3 @@
-// Keeps the calls it receives.
 #pragma once
 
 #include "messaging/ptc/Adapter.h"
@@ -8,6 +7,7 @@
 #include <QList>
 #include <QThread>
 
+// Records the calls it receives.
 class RecordingAdapter : public PTC::Adapter
 {
 public:

@@ -1,4 +1,3 @@
-// Ports of its own for every test program.
 #pragma once
 
 #include <netinet/in.h>
@@ -8,6 +7,7 @@
 #include <QByteArray>
 #include <QtGlobal>
 
+// Chooses free ports for each test program.
 namespace TestPorts
 {
 
@@ -23,8 +23,8 @@ inline bool isFree(int port)
     return free;
 }
 
-// Sets K2SYS_PORT_OFFSET so that the ports of the client numbers 1000 to 1008 are free, below those that the
-// system hands out.
+// Sets K2SYS_PORT_OFFSET so that the ports of the client numbers 1000 to 1008 are free and below those that
+// the system assigns to clients. Returns the offset.
 inline int useFreeOffset()
 {
     for (int i = 0; i < 2000; ++i) {

@@ -1,4 +1,3 @@
-// A peer on a plain socket, with frames of its own making.
 #pragma once
 
 #include "messaging/ptc/SocketFrame.h"
@@ -18,6 +17,7 @@
 #include <cstring>
 #include <utility>
 
+// A peer with a plain socket that builds its frames itself.
 class TestSocket
 {
 public:
@@ -54,7 +54,7 @@ public:
         return address;
     }
 
-    // All 20,480 bytes, written out by hand.
+    // Returns a whole frame of 20,480 bytes, built without the code of the program.
     static QByteArray frame(qint64 receiver, qint64 object, qint64 method, bool callback, qint64 size,
                             bool remote, const QByteArray& payload)
     {
@@ -94,7 +94,7 @@ public:
         return getpeername(m_socket, reinterpret_cast<sockaddr*>(&peer), &size) == 0;
     }
 
-    // False when the connection fails.
+    // Returns false when the connection fails.
     bool write(const QByteArray& bytes)
     {
         qsizetype sent = 0;
@@ -112,8 +112,8 @@ public:
         return true;
     }
 
-    // Writes block up to count times, taking what comes back, until nothing goes for a while. The whole
-    // blocks written.
+    // Writes the block up to count times and reads what arrives, until writing has blocked for a while.
+    // Returns the number of complete blocks written.
     int writeUntilBlocked(const QByteArray& block, int count)
     {
         for (int i = 0; i < count; ++i) {
@@ -132,7 +132,7 @@ public:
         return count;
     }
 
-    // Up to count bytes; fewer when the peer ends or patience does.
+    // Reads up to count bytes; fewer when the peer closes or the time is over.
     QByteArray read(qsizetype count)
     {
         QByteArray bytes;
@@ -162,7 +162,7 @@ public:
         }
     }
 
-    // The end of the connection leaves nothing behind in the system.
+    // Makes closing the socket reset the connection, so that it does not stay in TIME_WAIT.
     void resetAtEnd() const
     {
         const linger none{1, 0};
@@ -183,14 +183,14 @@ public:
         return n == 0 || (n == -1 && errno != EAGAIN);
     }
 
-    // Everything written lies in the peer's receive buffer or was read from it.
+    // Returns whether everything written has arrived in the peer's receive buffer.
     bool everythingDelivered() const
     {
         int pending = -1;
         return ioctl(m_socket, SIOCOUTQ, &pending) == 0 && pending == 0;
     }
 
-    // Whether the last read ended because the peer closed with data unread.
+    // Returns whether the last read ended because the peer closed with unread data.
     bool endedByReset() const { return m_reset; }
 
 private:

@@ -1,5 +1,4 @@
-// The property panel in a window of its own under a real finger, with its log and its settings in folders of
-// the test.
+// The property panel in a window with simulated fingers, with log and settings in folders of the test.
 #pragma once
 
 #include "canvas/MessageBoxController.h"
@@ -40,7 +39,7 @@ public:
 
 inline PostedMessages* postedMessages = nullptr;
 
-// Environment of one test program. Make it before anything logs or looks for settings.
+// The environment of one test program. Make it before anything is logged or settings are read.
 class PanelEnvironment
 {
 public:
@@ -66,13 +65,13 @@ public:
         IPathManagerEx::clearUp();
     }
 
-    // "[area] number: text" of every line of the operation log since the last call.
+    // Returns "[area] number: text" for each line of the operation log since the last call.
     QStringList newLogLines() { return log.takeOperations(); }
 
-    // The same of the debug log.
+    // Returns the same for the debug log.
     QStringList newDebugLines() { return log.takeDebugLines(); }
 
-    // The screen of the tests is smaller than the appliance's, so the window comes to the finger.
+    // Moves the window so that the point is on the screen, which is smaller than that of the appliance.
     void bringOnScreen(QWidget* widget, QPoint point)
     {
         const QPoint global = widget->mapToGlobal(point);
@@ -92,7 +91,7 @@ public:
     LogFixture log;
 };
 
-// A record with one plain character for each letter.
+// Returns a record with one plain character for each letter.
 inline TText plainText(const QString& letters = QStringLiteral("Abc"))
 {
     TText text;
@@ -109,7 +108,7 @@ inline TText plainText(const QString& letters = QStringLiteral("Abc"))
     return text;
 }
 
-// Three characters that differ in everything.
+// Returns a record of three characters that differ in every property.
 inline TText mixedText()
 {
     TText text = plainText();
@@ -142,14 +141,14 @@ inline QList<QString> colorsOf(const TText& text)
     return colors;
 }
 
-// What the panel sent last: a copy, since the record lives during the signal only.
+// A copy of what the panel sent last, since the record is valid only during the signal.
 struct SentStyle {
     TText style;
     int id = -1;
     int undoFlag = -1;
 };
 
-// A panel that is enabled, with whatever it sends.
+// An enabled panel that records what it sends.
 class Panel
 {
 public:
@@ -166,7 +165,7 @@ public:
     }
     ~Panel() { environment.newLogLines(); }
 
-    // Shows the record as the canvas does for an object that is selected as one.
+    // Shows the record like that of an object selected as a whole.
     void select(TText text, bool shadowAlign = true, bool move = true)
     {
         panel->selectionModeForShadowAndAlign(shadowAlign, move);

@@ -7,15 +7,15 @@
 namespace PictureNames
 {
 
-// The string literals of C++ source, each run of adjacent ones joined; comments are left out.
+// Returns the string literals of C++ source, with adjacent ones joined, except those in comments.
 QStringList literals(const QString& source);
 
-// What a literal says about resource paths. Each entry is a path (":/A/B"), the beginning of paths (":/A/B_",
+// Returns the resource paths in a literal. Each entry is a path (":/A/B"), the beginning of paths (":/A/B_",
 // ":/A/") or a path with placeholders (":/A/B_%1"). Lists of slices ("A:B_Rest_Left:B_Rest_Center:...") and
-// style sheets (url(:/A/B)) are taken apart. A pattern of nothing but placeholders says nothing.
+// style sheets (url(:/A/B)) are split. A pattern that consists of placeholders only gives no entry.
 QStringList paths(const QString& literal);
 
-// Whether one of the existing paths is meant.
+// Returns whether the path matches one of the existing paths.
 bool exists(const QString& path, const QStringList& existing);
 
 } // namespace PictureNames

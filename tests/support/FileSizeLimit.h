@@ -1,10 +1,9 @@
-// A disk that takes no more, for the files of this process.
 #pragma once
 
 #include <csignal>
 #include <sys/resource.h>
 
-// Until its end, no file of this process grows beyond so many bytes.
+// Limits the size of all files that this process writes, like a full disk, until it is destroyed.
 class FileSizeLimit
 {
 public:

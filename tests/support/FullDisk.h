@@ -1,10 +1,10 @@
-// A disk that takes no more bytes, as the limit on the size of files makes it. What is written meanwhile, by
-// any thread, is refused; files can still be made, renamed and removed. One at a time.
 #pragma once
 
 #include <csignal>
 #include <sys/resource.h>
 
+// Simulates a full disk by limiting the size of files to 0. Writes by any thread fail meanwhile; files can
+// still be created, renamed and removed. Only one may exist at a time.
 class FullDisk
 {
 public:

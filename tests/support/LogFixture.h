@@ -1,4 +1,3 @@
-// Log files of the test's own, and what is written to them.
 #pragma once
 
 #include "support/LogManager.h"
@@ -8,20 +7,21 @@
 #include <QStringList>
 #include <QTemporaryDir>
 
-// One at a time.
+// Log files for one test, and the lines written to them. Only one may exist at a time.
 class LogFixture
 {
 public:
     LogFixture()
     {
         qputenv("K2SYS_LOG_DIR", mDir.path().toLocal8Bit());
-        UNINIT_LOGGING(); // the input context of an application has begun in another folder
+        UNINIT_LOGGING(); // the input context of an application has started the log in another folder
         INIT_LOGGING(L"test");
     }
     ~LogFixture() { UNINIT_LOGGING(); }
 
-    // "number: text" of the area's lines since the last call, of whatever area that was, in the operation log
-    // and in the debug log; of all areas, as "[area] number: text", when none is named.
+    // Return the lines since the last call: takeOperations() of the operation log, takeDebugLines() of the
+    // debug log. With an area as "number: text", only those of the area; lines of other areas are dropped.
+    // Without one as "[area] number: text".
     QStringList takeOperations(const QString& area = {})
     {
         return take(QStringLiteral("k2_ope.log"), mOperationsEnd, area);

@@ -7,8 +7,8 @@
 
 #include <chrono>
 
-// Lists everything in a folder by name, hidden files too. Waits first for the disk to take what was saved:
-// until then the version before lies beside a saved file.
+// Returns the names of all entries of a folder, including hidden ones. First waits until saved files are
+// synced, since until then the previous version exists beside a saved file.
 inline QStringList settledEntries(const QString& folder)
 {
     FileSyncQueue::flush(std::chrono::seconds(30));

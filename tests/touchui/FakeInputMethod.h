@@ -8,7 +8,7 @@
 #include <QString>
 #include <qpa/qplatforminputcontext.h>
 
-// Stands for an input method that composes.
+// An input method with uncommitted input, for tests.
 class FakeInputMethod : public QPlatformInputContext
 {
 public:

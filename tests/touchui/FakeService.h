@@ -1,4 +1,3 @@
-// Stands for the process that shows the soft keyboard: notes what it is asked for, and answers nothing.
 #pragma once
 
 #include "messaging/services/ISoftKeyBoardController.h"
@@ -8,6 +7,7 @@
 #include <QString>
 #include <QStringList>
 
+// Replaces the process that shows the soft keyboard: records the calls and does not answer.
 class FakeService : public ISoftKeyBoardController
 {
 public:

@@ -1,5 +1,3 @@
-// A window with one field of each kind and a service that records what it is told. Programs that use it call
-// KSInputContext::install() before QApplication.
 #pragma once
 
 #include "messaging/services/SubCommonDefine.h"
@@ -22,7 +20,7 @@
 #include <QTest>
 #include <QVBoxLayout>
 
-// A text item as the canvas has them.
+// A text item like those of the canvas.
 class FakeTextItem : public QGraphicsTextItem
 {
 public:
@@ -80,6 +78,8 @@ inline SubCommonDefine::tagSoftKeyBoardKeyData keyRecord(int type, int key, cons
     return data;
 }
 
+// A window with one field of each kind and a service that records its calls. Programs that use it call
+// KSInputContext::install() before QApplication.
 class InputContextFixture : public QObject
 {
     Q_OBJECT
@@ -157,7 +157,7 @@ inline void InputContextFixture::open(QWidget* widget)
     QVERIFY(!KSInputContext::isSoftKeyboardClosed());
 }
 
-// On the physical keyboard.
+// Types on the physical keyboard.
 inline void InputContextFixture::type(const char* letters)
 {
     for (; *letters != '\0'; ++letters) {

@@ -1,4 +1,3 @@
-// A clock for the timers of touch widgets that goes on only when it is told to.
 #pragma once
 
 #include "touchui/TouchTimer.h"
@@ -9,6 +8,7 @@
 #include <QPointer>
 #include <QTimerEvent>
 
+// A clock for the timers of touch widgets that the test advances.
 class ManualClock : public TouchTimer::Clock
 {
 public:
@@ -22,7 +22,7 @@ public:
     }
     void stop(QObject*, int id) override { mTimers.remove(id); }
 
-    // Fires what falls due, in its order.
+    // Advances the clock and fires the timers that become due, in order.
     void advance(int milliseconds)
     {
         const qint64 end = mNow + milliseconds;
@@ -40,7 +40,7 @@ public:
         }
         mNow = end;
     }
-    // Timers that run.
+    // Returns the number of running timers.
     int running() const { return static_cast<int>(mTimers.size()); }
 
 private:
@@ -62,5 +62,5 @@ private:
 
     QMap<int, Timer> mTimers;
     qint64 mNow = 0;
-    int mLastId = 1 << 24; // out of the way of Qt's own timers
+    int mLastId = 1 << 24; // above the ids of Qt's own timers
 };

@@ -1,5 +1,3 @@
-// A list of rows in a window, the application's filter before it, fingers from a touch device and a clock to
-// drive.
 #pragma once
 
 #include "ManualClock.h"
@@ -17,7 +15,7 @@
 
 #include <memory>
 
-// A row that can be told by its name. Its clone floats during a drag.
+// A row that can be identified by its name. Its clone is shown during a drag.
 class Row : public KSBaseItemWidget
 {
 public:
@@ -37,12 +35,14 @@ public:
     bool mHasClone;
 };
 
+// A list of rows in a window with the application's event filter, fingers of a touch device, and a clock that
+// the test advances.
 class ScrollViewerFixture : public QObject
 {
 public:
     static constexpr int WIDTH = 400;
     static constexpr int HEIGHT = 500;
-    static constexpr int ROW = 104; // with the gap
+    static constexpr int ROW = 104; // height with the gap
 
     explicit ScrollViewerFixture(QPointingDevice* device) : mDevice(device)
     {
@@ -74,19 +74,19 @@ public:
         log.clear();
     }
 
-    // Fingers, in coordinates of the list.
+    // Fingers in coordinates of the list
     void press(int x, int y, int id = 0) { touch().press(id, QPoint(x, y), mList); }
     void move(int x, int y, int id = 0) { touch().move(id, QPoint(x, y), mList); }
     void release(int x, int y, int id = 0) { touch().release(id, QPoint(x, y), mList); }
     QTest::QTouchEventWidgetSequence touch() { return QTest::touchEvent(&mWindow, mDevice); }
-    // Several fingers: one sequence remembers where the others are. Each step ends with commit().
+    // Returns a sequence for several fingers, which keeps their positions. Each step ends with commit().
     QTest::QTouchEventWidgetSequence fingers() { return QTest::touchEvent(&mWindow, mDevice, false); }
     void tap(int x, int y)
     {
         press(x, y);
         release(x, y);
     }
-    // A steady motion with a tick of the clock after each step.
+    // Moves the finger at constant speed, with one tick of the clock after each step.
     void drag(int x, int fromY, int toY, int steps)
     {
         for (int i = 1; i <= steps; ++i) {
@@ -106,7 +106,7 @@ public:
     }
     QStringList takeLog() { return std::exchange(log, {}); }
 
-    ManualClock clock; // before all widgets
+    ManualClock clock; // declared before all widgets, which use it
     KSAppEventFilter mFilter;
     QWidget mWindow;
     KSScrollViewerWidget* mList = nullptr;

@@ -1,5 +1,3 @@
-// A list in a window under the application's filter, made anew for each test; no test may leave a lock
-// behind.
 #pragma once
 
 #include "ScrollViewerFixture.h"
@@ -9,6 +7,8 @@
 
 #include <memory>
 
+// Makes a list in a window with the application's event filter for each test, and checks afterwards that no
+// lock is left.
 class ScrollViewerTest : public QObject
 {
     Q_OBJECT
@@ -22,6 +22,6 @@ protected:
     void lift(int row);
 
     QPointingDevice* m_device = nullptr;
-    QPointingDevice* m_other = nullptr; // a second screen
+    QPointingDevice* m_other = nullptr; // another touch screen
     std::unique_ptr<ScrollViewerFixture> m;
 };

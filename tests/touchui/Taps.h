@@ -2,9 +2,9 @@
 
 #include <QTest>
 
-// Taps and double taps of one finger at a place in the coordinates of the widget. All events but the last are
-// sent in one turn of the event loop: on a busy machine a turn can last as long as a hold, or longer than a
-// double tap may.
+// Taps with one finger, once or twice, at a place in widget coordinates. All events but the last are sent
+// without returning to the event loop: on a busy machine that can take as long as a long press, or longer
+// than the time for a double tap.
 inline void tapTimes(int times, QWidget* widget, QPointingDevice* device, const QPoint& place)
 {
     auto finger = QTest::touchEvent(widget, device, false);

@@ -11,8 +11,8 @@
 
 #include <memory>
 
-// A touch screen and the application's filter, as long as it lives, and short names for what fingers do.
-// Positions are in the coordinates of the widget.
+// A touch screen and the application's event filter, with short names for the actions of fingers. Positions
+// are in widget coordinates.
 class TouchFixture
 {
 public:

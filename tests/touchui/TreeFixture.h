@@ -1,4 +1,3 @@
-// A source of folders and files for the tree, which counts what it is asked.
 #pragma once
 
 #include "touchui/KSModelAttributeItem.h"
@@ -20,6 +19,7 @@ struct SourceNode {
     QList<SourceNode*> children;
 };
 
+// A source of folders and files for the tree that counts the requests.
 class TreeSource : public KSModelDataFactory
 {
 public:

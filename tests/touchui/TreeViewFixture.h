@@ -1,4 +1,3 @@
-// A tree with a source behind it, under the application's filter and a finger.
 #pragma once
 
 #include "TreeFixture.h"
@@ -23,7 +22,7 @@
 inline constexpr int ROW = 48;
 inline const QColor BACKGROUND(51, 51, 51);
 
-// Lets the tests see the ticks of the motion.
+// Makes the steps of the motion visible to the tests.
 class ProbeTree : public KSTreeView
 {
 public:
@@ -46,6 +45,7 @@ public:
     bool isControlSelfEnding() const override { return true; }
 };
 
+// A tree with a source, the application's event filter and fingers.
 class TreeViewFixture : public QObject
 {
     Q_OBJECT
