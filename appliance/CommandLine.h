@@ -11,8 +11,8 @@ public:
 
     QString line() const { return m_line; }
     QString word() const { return m_word; }
-    // Returns the arguments, which are separated by blanks. Double quotes protect blanks; within them \", \\
-    // and \n stand for a quote, a backslash and a line feed.
+    // Returns the arguments, which are separated by blanks. Double quotes protect blanks; a quote, a
+    // backslash and a line feed are written within them as \", \\ and \n.
     QStringList arguments() const { return m_arguments; }
     // Returns everything behind the command word unchanged, or without its quotes if it is a single quoted
     // text.
