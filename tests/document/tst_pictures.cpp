@@ -299,7 +299,7 @@ private Q_SLOTS:
         QFile claimed(mFolder->filePath("claimed.png"));
         QVERIFY(claimed.open(QIODevice::WriteOnly) && claimed.write(bytes) == bytes.size());
         claimed.close();
-        const qint64 before = peakMemory();
+        [[maybe_unused]] const qint64 before = peakMemory();
         QVERIFY(!ImageResizer().isAvailableImage(path("claimed.png")));
         QVERIFY(ImageResizer().isAvailableImage(path("one.png")));
 #ifndef __SANITIZE_ADDRESS__
