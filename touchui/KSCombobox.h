@@ -87,6 +87,7 @@ private:
     void comeUp();
     int longestTextWidth() const;
 
+    OneFinger m_finger{this};   // first: the making of the others sends events that it looks at
     QWidget* m_popup = nullptr; // the list's window, owned by the base class
     CustomComboBoxView* m_view;
     CustomComboBoxDelegate* m_delegate;
@@ -99,5 +100,4 @@ private:
     bool m_popupUpper = false;
     bool m_pressed = false;
     bool m_shown = false; // the last signalShowComboxList() was sent with true
-    OneFinger m_finger{this};
 };

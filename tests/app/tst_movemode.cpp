@@ -26,7 +26,7 @@ private:
     std::unique_ptr<QWidget> mWindow;
     std::unique_ptr<MoveMode> mMode;
     QWidget* mList = nullptr;
-    QPointingDevice* mDevice = QTest::createTouchDevice();
+    std::unique_ptr<QPointingDevice> mDevice{QTest::createTouchDevice()};
 };
 
 void tst_MoveMode::init()
@@ -69,7 +69,7 @@ std::unique_ptr<QEvent> tst_MoveMode::event(QEvent::Type type, const QPointF& gl
     case QEvent::TouchBegin:
     case QEvent::TouchEnd:
         return std::make_unique<QTouchEvent>(
-            type, mDevice, Qt::NoModifier,
+            type, mDevice.get(), Qt::NoModifier,
             QList<QEventPoint>{QEventPoint(0, QEventPoint::Pressed, global, global)});
     case QEvent::Wheel:
         return std::make_unique<QWheelEvent>(global, global, QPoint(), QPoint(0, 120), Qt::NoButton,
@@ -118,7 +118,7 @@ void tst_MoveMode::endsWithPressesBesideTheList()
 void tst_MoveMode::touchWithoutPointsEndsNothing()
 {
     mMode->setOn(true);
-    const QTouchEvent touch(QEvent::TouchBegin, mDevice, Qt::NoModifier, QList<QEventPoint>());
+    const QTouchEvent touch(QEvent::TouchBegin, mDevice.get(), Qt::NoModifier, QList<QEventPoint>());
     QVERIFY(!mMode->isEndedBy(mWindow.get(), &touch, mList));
 }
 
