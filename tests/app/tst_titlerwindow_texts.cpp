@@ -191,7 +191,7 @@ void tst_TitlerWindow_Texts::init()
         Looks().applyTo(*style);
     auto* other = LibraryFixture::makeText(QStringLiteral("other"), 2, 100, 500);
     other->textItems().front()->setFontSize(96);
-    styled->setText({new TText(*styled->text().front()), other});
+    styled->setText({styled->text().front(), other});
     ArchiveController().saveNewArchive(mFolder, styled.get());
     LibraryFixture::writeOrder(mFolder, {"a", "b", "styled"});
     show();
