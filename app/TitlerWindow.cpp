@@ -3,6 +3,7 @@
 #include "app/APPEventFilter.h"
 #include "app/EditContextController.h"
 #include "app/MoveMode.h"
+#include "app/RequestedPath.h"
 #include "app/SavingNotice.h"
 #include "app/SiblingLinks.h"
 #include "app/ToolsBar.h"
@@ -17,7 +18,6 @@
 #include "library/ThumbnailRender.h"
 #include "panel/TextToolsPanel.h"
 #include "support/ConfinedPath.h"
-#include "support/IPathManagerEx.h"
 #include "support/LogManager.h"
 #include "touchui/Balloon.h"
 #include "touchui/KSInputContext.h"
@@ -31,7 +31,6 @@
 #include <QApplication>
 #include <QCloseEvent>
 #include <QDebug>
-#include <QFileInfo>
 #include <QGraphicsView>
 #include <QInputMethodEvent>
 #include <QLabel>
@@ -69,11 +68,6 @@ constexpr int LOG_NUMBER = 400;
 constexpr int FOCUS_COMMAND_ID = 1;
 constexpr int CANVAS_CHECKER = 2;
 
-bool isBelowTitles(const QString& path)
-{
-    return ConfinedPath::isBelow(&IPathManagerEx::getTitleResourcesPath, path.toStdString());
-}
-
 bool isGraphicsView(const QWidget* widget)
 {
     // The widget may be the viewport of the view.
@@ -82,12 +76,6 @@ bool isGraphicsView(const QWidget* widget)
             return true;
     }
     return false;
-}
-
-// Files outside the title folders must not be changed or cleaned up.
-void logRefusedRequest(const QString& path)
-{
-    ConfinedPath::logRefusal(L"a request asks for what lies outside: ", path.toStdString());
 }
 
 } // namespace
@@ -333,9 +321,13 @@ void TitlerWindow::showTitlerWindow(titler_paramter paramter)
     if (!isHidden())
         return;
     mUnsavedWork.takeQuestion();
-    show();
-    activateWindow();
-    raise();
+    const RequestedPath path(QString::fromStdWString(paramter.path));
+    // A window manager may lose the next request's window to the late end of one that only flashed up.
+    if (paramter.mode != _titler_paramter::CREATE_OR_EDIT || path.canBeOpened()) {
+        show();
+        activateWindow();
+        raise();
+    }
     mLinks->changeTopWindow(MessageDefine::TOP_WINDOW_TITLER);
     mLinks->setMessageMainWindow(this);
     mCanvasScene->setModuleInfo(m_emModuleInfo);
@@ -370,22 +362,25 @@ void TitlerWindow::beginSession(const titler_paramter& parameter)
 
 void TitlerWindow::refreshArchiveList(QString path)
 {
-    if (path.isEmpty()) {
+    const RequestedPath requested(path);
+    switch (requested.target()) {
+    case RequestedPath::Target::Choice:
         mFolderPicker->updateTreeView();
         showFolderDialog();
         return;
-    }
-    const QFileInfo info(path);
-    const qsizetype slash = path.lastIndexOf(QLatin1Char('/'));
-    if (!info.exists()) {
-        hide();
-    } else if (!isBelowTitles(path) || (!info.isDir() && !isBelowTitles(path.left(slash)))) {
-        logRefusedRequest(path);
-        hide(); // same as for a path that does not exist
-    } else if (info.isDir()) {
+    case RequestedPath::Target::Folder:
         mArchiveList->refreshArchiveList(path);
-    } else {
-        mArchiveList->refreshArchiveListInFile(path.left(slash), path.mid(slash + 1));
+        break;
+    case RequestedPath::Target::Title:
+        mArchiveList->refreshArchiveListInFile(requested.folder(), requested.fileName());
+        break;
+    case RequestedPath::Target::Outside:
+        ConfinedPath::logRefusal(L"a request asks for what lies outside: ", path.toStdString());
+        hide(); // same as for a path that does not exist
+        break;
+    case RequestedPath::Target::Missing:
+        hide();
+        break;
     }
     markOpenFolder();
 }

@@ -7,9 +7,10 @@
 // One log file of the appliance, to which several processes append whole lines.
 //
 // A full file is renamed to ".1", and the older ones to the next number; four old files are kept. The process
-// that fills the file does this under a lock, for which no process waits; the other processes notice that the
-// path leads to another file and open that. If a file cannot be renamed it is emptied, so that a log never
-// fills the disk. Any thread.
+// that fills the file does this under a lock, for which no process waits: meanwhile the other processes write
+// on into the full file, which exceeds its size by these lines. Then they notice that the path leads to
+// another file and open that. If a file cannot be renamed it is emptied, so that a log never fills the disk.
+// Any thread.
 class LogFile
 {
 public:

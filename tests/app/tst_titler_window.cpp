@@ -45,6 +45,24 @@ constexpr long MESSAGE_CENTER = 65;
 constexpr long SET_TOP_WINDOW = 1;
 constexpr long POST_MESSAGE = 3;
 
+// Counts how often a window is shown, however shortly.
+class ShowCounter : public QObject
+{
+public:
+    explicit ShowCounter(QObject* window) { window->installEventFilter(this); }
+    int count() const { return mCount; }
+
+protected:
+    bool eventFilter(QObject* /*watched*/, QEvent* event) override
+    {
+        mCount += event->type() == QEvent::Show ? 1 : 0;
+        return false;
+    }
+
+private:
+    int mCount = 0;
+};
+
 } // namespace
 
 class tst_titler_window : public QObject
@@ -61,9 +79,9 @@ private Q_SLOTS:
     void folderRequestShowsItsTitles();
     void fileRequestShowsTheTitle();
     void secondRequestIsDropped();
-    void missingPathHidesAgain();
-    void pathsOutsideHideAgain_data();
-    void pathsOutsideHideAgain();
+    void missingPathIsNeverShown();
+    void pathsOutsideAreNeverShown_data();
+    void pathsOutsideAreNeverShown();
     void closeHidesAndEmpties();
     void closeWithNewFilesAsksFirst();
     void closeWhileFingersRestOnTitles();
@@ -206,13 +224,15 @@ void tst_titler_window::secondRequestIsDropped()
     QCOMPARE(list()->getCurrentPath(), first);
 }
 
-void tst_titler_window::missingPathHidesAgain()
+void tst_titler_window::missingPathIsNeverShown()
 {
+    const ShowCounter shows(mWindow);
     request(mFiles.titleRoot() + "/nowhere");
     QVERIFY(!mWindow->isVisible());
+    QCOMPARE(shows.count(), 0);
 }
 
-void tst_titler_window::pathsOutsideHideAgain_data()
+void tst_titler_window::pathsOutsideAreNeverShown_data()
 {
     QTest::addColumn<QString>("path");
     QTest::newRow("folder") << "%1/elsewhere/foreign";
@@ -227,7 +247,7 @@ void tst_titler_window::pathsOutsideHideAgain_data()
     QTest::newRow("beside the root") << "%2 2/foreign";
 }
 
-void tst_titler_window::pathsOutsideHideAgain()
+void tst_titler_window::pathsOutsideAreNeverShown()
 {
     QFETCH(QString, path);
     const QString data = QFileInfo(QFileInfo(mFiles.titleRoot()).path()).path();
@@ -246,8 +266,10 @@ void tst_titler_window::pathsOutsideHideAgain()
     QFile::remove(data + "/elsewhere/ours.xml");
     QVERIFY(QFile::link(mFiles.titleRoot() + "/news/t1.xml", data + "/elsewhere/ours.xml"));
     mLog.takeDebugLines();
+    const ShowCounter shows(mWindow);
     request(path.replace("%1", data).replace("%2", mFiles.titleRoot()));
     QVERIFY(!mWindow->isVisible());
+    QCOMPARE(shows.count(), 0);
     QVERIFY(list()->getCurrentPath().isEmpty());
     QCOMPARE(mLog.takeDebugLines("ConfinedPath"),
              QStringList("400: Refused, a request asks for what lies outside: " + path));
