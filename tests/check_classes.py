@@ -7,10 +7,9 @@ not be. With --self-test it checks that it finds such classes in a small tree.
 import os
 import re
 import sys
-import tempfile
 
-FOLDERS = ["support", "messaging", "document", "touchui", "canvas", "panel", "library", "app", "appliance", "gallery",
-           "bench"]
+import sourcetree
+
 # A second source that stays: the tables of connections between the objects that the window owns.
 EXCEPTIONS = {"TitlerWindow": {"app/TitlerWindow.cpp", "app/TitlerWindowWiring.cpp"}}
 
@@ -21,13 +20,8 @@ MEMBER = re.compile(r"^(?:[A-Za-z_][\w:<>,&*\s\[\]]*?[\s&*])?((?:\w+::)+)(?:~?\w
 
 
 def sources(root):
-    for top in FOLDERS:
-        for folder, _, names in sorted(os.walk(os.path.join(root, top))):
-            for name in sorted(names):
-                if name.endswith((".h", ".cpp")):
-                    path = os.path.join(folder, name)
-                    with open(path, encoding="utf-8") as stream:
-                        yield os.path.relpath(path, root), COMMENT_OR_STRING.sub("", stream.read())
+    for path in sourcetree.files(root, sourcetree.LAYERS + sourcetree.PROGRAMS, (".h", ".cpp")):
+        yield path, COMMENT_OR_STRING.sub("", sourcetree.read(os.path.join(root, path)))
 
 
 def classes_in_sources(root):
@@ -56,34 +50,15 @@ def check(root):
     return errors
 
 
-def self_test():
-    with tempfile.TemporaryDirectory() as root:
-        def write(path, text):
-            os.makedirs(os.path.join(root, os.path.dirname(path)), exist_ok=True)
-            with open(os.path.join(root, path), "w", encoding="utf-8") as stream:
-                stream.write(text)
-
-        write("canvas/A.h", "class A : public B\n{\n    struct Part { int x; };\n};\nnamespace N { void f(); }\n")
-        write("canvas/A.cpp", "const int A::SIZE(3);\nA::A() = default;\nvoid N::f()\n{\n    A::g();\n}\n")
-        write("canvas/Other.cpp", "// void A::f()\nvoid N::g()\n{\n}\nint other(A::Part);\n")
-        assert check(root) == [], check(root)
-        write("canvas/APart.cpp", "const std::vector<A::Part>&\nA::parts(int)\n{\n}\n")
-        errors = check(root)
-        assert errors == ["A: canvas/A.cpp, canvas/APart.cpp"], errors
-
-
-def main(arguments):
-    if arguments == ["--self-test"]:
-        self_test()
-        return 0
-    if len(arguments) != 1:
-        print(__doc__, file=sys.stderr)
-        return 2
-    errors = check(arguments[0])
-    for error in errors:
-        print(error)
-    return 1 if errors else 0
+def self_test(tree):
+    tree.write("canvas/A.h", "class A : public B\n{\n    struct Part { int x; };\n};\nnamespace N { void f(); }\n")
+    tree.write("canvas/A.cpp", "const int A::SIZE(3);\nA::A() = default;\nvoid N::f()\n{\n    A::g();\n}\n")
+    tree.write("canvas/Other.cpp", "// void A::f()\nvoid N::g()\n{\n}\nint other(A::Part);\n")
+    assert check(tree.root) == [], check(tree.root)
+    tree.write("canvas/APart.cpp", "const std::vector<A::Part>&\nA::parts(int)\n{\n}\n")
+    errors = check(tree.root)
+    assert errors == ["A: canvas/A.cpp, canvas/APart.cpp"], errors
 
 
 if __name__ == "__main__":
-    sys.exit(main(sys.argv[1:]))
+    sys.exit(sourcetree.main(__doc__, check, self_test))

@@ -15,10 +15,9 @@ import glob
 import os
 import re
 import sys
-import tempfile
 
-FOLDERS = ["support", "messaging", "document", "touchui", "canvas", "panel", "library", "app", "appliance", "gallery",
-           "bench", "fuzz", "tests"]
+import sourcetree
+
 OTHER_FOLDERS = ["cmake", "docs", "resources", "scripts"]
 
 COMMENT_OR_STRING = re.compile(r'//[^\n]*|/\*.*?\*/|"(?:\\.|[^"\\\n])*"', re.DOTALL)
@@ -37,21 +36,8 @@ IN_BACKTICKS = re.compile(r"`([^`\n]+)`")
 QUALIFIED = re.compile(r"~?\b[A-Za-z_]\w*(?:::~?\w+)+")
 CLASS_NAME = re.compile(r"^[A-Z]+[a-z]\w*[A-Z]\w*$")
 TEST_NAME = re.compile(r"\b(tst|e2e|fuzz_replay)_(\w+)(?!\w|\*)")
-PATH = re.compile(rf"(?:{'|'.join(FOLDERS + OTHER_FOLDERS)})/(?:(?![A-Z]+/)[\w.-]+/?)*$")
+PATH = re.compile(rf"(?:{'|'.join(sourcetree.FOLDERS + OTHER_FOLDERS)})/(?:(?![A-Z]+/)[\w.-]+/?)*$")
 FOREIGN = re.compile(r"^(?:Q[A-Z]\w*|Qt|std|boost)$")
-
-
-def read(path):
-    with open(path, encoding="utf-8", errors="replace") as stream:
-        return stream.read()
-
-
-def files(root, suffixes):
-    for top in FOLDERS:
-        for folder, _, names in sorted(os.walk(os.path.join(root, top))):
-            for name in sorted(names):
-                if name.endswith(suffixes):
-                    yield os.path.join(folder, name)
 
 
 def end_of_braces(text, begin):
@@ -96,8 +82,8 @@ class Sources:
         self.members = {}  # by class or namespace
         self.bases = {}
         self.words = set()
-        for path in files(root, (".h", ".cpp", ".py", ".txt")):
-            text = read(path)
+        for path in sourcetree.files(root, sourcetree.FOLDERS, (".h", ".cpp", ".py", ".txt")):
+            text = sourcetree.read(os.path.join(root, path))
             self.words.update(re.findall(r"\w+", text))
             if path.endswith((".h", ".cpp")):
                 self.add_rows(text)
@@ -158,63 +144,44 @@ def check(root):
     errors = []
     for path in ["README.md", "CONTRIBUTING.md", "docs/*.md"]:
         for document in sorted(glob.glob(os.path.join(root, path))):
-            names = sorted(set(missing_names(root, sources, read(document))))
+            names = sorted(set(missing_names(root, sources, sourcetree.read(document))))
             errors += [f"{os.path.relpath(document, root)}: {name}" for name in names]
     return errors
 
 
-def self_test():
-    with tempfile.TemporaryDirectory() as root:
-        def write(path, text):
-            os.makedirs(os.path.join(root, os.path.dirname(path)), exist_ok=True)
-            with open(os.path.join(root, path), "w", encoding="utf-8") as stream:
-                stream.write(text)
+def self_test(tree):
+    tree.write("canvas/ShownBase.h", "class ShownBase\n{\n    void inherited(int argument);\n};\n")
+    tree.write("canvas/ShownTitle.h", "class ShownTitle : public QObject, private ShownBase\n{\npublic:\n"
+               "    ~ShownTitle() override;\n    bool save() { return inner(helper()); }\n"
+               "    enum class Gesture { None, Press };\n    int m_data = other(1);\n};\n"
+               "namespace Motion\n{\nint step(int way, int by = other(2));\n}\n"
+               "namespace Titles\n{\n#define tagPath_FIELDS(FIELD) FIELD(Wide, path)\n}\n// class Gone { void f(); };\n")
+    tree.write("messaging/services/ITitler.h", "#define Titler_CALLS(CALL) \\\n    CALL(1, show, int, type) \\\n"
+               "    CALL(5, hide)\n#define Titler_ANSWERS(ANSWER) \\\n    ANSWER(1, finished)\n")
+    tree.write("tests/canvas/tst_shown.cpp", "")
+    tree.write("tests/e2e/test_list.py", "")
+    tree.write("fuzz/fuzz_title.cpp", "")
+    good = ("`ShownTitle::save`, `ShownTitle::save()` and `~ShownTitle`, `ShownTitle::inherited`, `Motion::step`,\n"
+            "`ShownTitle::Gesture`, `Gesture::Press`, `ShownTitle::m_data`, `QImage::save`, `std::async`,\n"
+            "`ShownBase`, `ITitler::show`, `TitlerRemoteProxy::hide`, `TitlerCallBackAdapter::finished`,\n"
+            "`tst_shown`, `e2e_list`, `fuzz_replay_title`, `fuzz_replay_*`, `canvas/ShownTitle.h`,\n"
+            "`canvas/ShownTitle`, `tests/NAME/x`, `tests/e2e/`, `canvas/I*.h`, `build/bin/x`, `Titles::tagPath`\n"
+            "Gone::f and tst_gone\n```sh\nctest -R '^e2e_list$'\n```\n")
+    tree.write("README.md", good)
+    tree.write("docs/GUIDE.md", good)
+    assert check(tree.root) == [], check(tree.root)
 
-        write("canvas/ShownBase.h", "class ShownBase\n{\n    void inherited(int argument);\n};\n")
-        write("canvas/ShownTitle.h", "class ShownTitle : public QObject, private ShownBase\n{\npublic:\n"
-              "    ~ShownTitle() override;\n    bool save() { return inner(helper()); }\n"
-              "    enum class Gesture { None, Press };\n    int m_data = other(1);\n};\n"
-              "namespace Motion\n{\nint step(int way, int by = other(2));\n}\n"
-              "namespace Titles\n{\n#define tagPath_FIELDS(FIELD) FIELD(Wide, path)\n}\n// class Gone { void f(); };\n")
-        write("messaging/services/ITitler.h", "#define Titler_CALLS(CALL) \\\n    CALL(1, show, int, type) \\\n"
-              "    CALL(5, hide)\n#define Titler_ANSWERS(ANSWER) \\\n    ANSWER(1, finished)\n")
-        write("tests/canvas/tst_shown.cpp", "")
-        write("tests/e2e/test_list.py", "")
-        write("fuzz/fuzz_title.cpp", "")
-        good = ("`ShownTitle::save`, `ShownTitle::save()` and `~ShownTitle`, `ShownTitle::inherited`, `Motion::step`,\n"
-                "`ShownTitle::Gesture`, `Gesture::Press`, `ShownTitle::m_data`, `QImage::save`, `std::async`,\n"
-                "`ShownBase`, `ITitler::show`, `TitlerRemoteProxy::hide`, `TitlerCallBackAdapter::finished`,\n"
-                "`tst_shown`, `e2e_list`, `fuzz_replay_title`, `fuzz_replay_*`, `canvas/ShownTitle.h`,\n"
-                "`canvas/ShownTitle`, `tests/NAME/x`, `tests/e2e/`, `canvas/I*.h`, `build/bin/x`, `Titles::tagPath`\n"
-                "Gone::f and tst_gone\n```sh\nctest -R '^e2e_list$'\n```\n")
-        write("README.md", good)
-        write("docs/GUIDE.md", good)
-        assert check(root) == [], check(root)
-
-        # Each of these is one error.
-        bad = ["ShownTitle::inner", "ShownTitle::helper", "ShownTitle::way", "ShownTitle::other", "ShownBase::argument",
-               "Gone::f", "Motion::leap", "ITitler::finished", "ShownBase::save", "ShownPage", "tst_gone", "tst_show",
-               "e2e_shown", "fuzz_replay_gone", "canvas/Gone.h", "tests/gone/"]
-        for name in bad:
-            write("docs/GUIDE.md", good + f"`{name}`\n")
-            assert check(root) == [f"docs/GUIDE.md: {name}"], (name, check(root))
-        write("docs/GUIDE.md", "```sh\nctest -R e2e_gone\n```\n")
-        write("README.md", "`tst_gone`\n")
-        assert check(root) == ["README.md: tst_gone", "docs/GUIDE.md: e2e_gone"], check(root)
-
-
-def main(arguments):
-    if arguments == ["--self-test"]:
-        self_test()
-        return 0
-    if len(arguments) != 1:
-        print(__doc__, file=sys.stderr)
-        return 2
-    errors = check(arguments[0])
-    for error in errors:
-        print(error)
-    return 1 if errors else 0
+    # Each of these is one error.
+    bad = ["ShownTitle::inner", "ShownTitle::helper", "ShownTitle::way", "ShownTitle::other", "ShownBase::argument",
+           "Gone::f", "Motion::leap", "ITitler::finished", "ShownBase::save", "ShownPage", "tst_gone", "tst_show",
+           "e2e_shown", "fuzz_replay_gone", "canvas/Gone.h", "tests/gone/"]
+    for name in bad:
+        tree.write("docs/GUIDE.md", good + f"`{name}`\n")
+        assert check(tree.root) == [f"docs/GUIDE.md: {name}"], (name, check(tree.root))
+    tree.write("docs/GUIDE.md", "```sh\nctest -R e2e_gone\n```\n")
+    tree.write("README.md", "`tst_gone`\n")
+    assert check(tree.root) == ["README.md: tst_gone", "docs/GUIDE.md: e2e_gone"], check(tree.root)
 
 
 if __name__ == "__main__":
-    sys.exit(main(sys.argv[1:]))
+    sys.exit(sourcetree.main(__doc__, check, self_test))

@@ -1,7 +1,7 @@
 #!/usr/bin/env python3
 """Checks the architecture of the source tree: check_includes.py ROOT
 
- - A folder includes only from itself and from folders before it in LAYERS (resources/ holds no code).
+ - A folder includes only from itself and from folders before it in sourcetree.LAYERS.
  - Project headers are included from the root, as "folder/X.h", and exist.
  - No two headers include each other, directly or through others.
  - No source file is longer than MAX_LINES.
@@ -10,24 +10,16 @@ Prints every violation and ends 1 if there is one. With --self-test it checks th
 import os
 import re
 import sys
-import tempfile
 
-LAYERS = ["support", "messaging", "document", "touchui", "canvas", "panel", "library", "app"]
-UPPER = ["appliance", "gallery", "bench", "fuzz", "tests"]
+import sourcetree
+from sourcetree import FOLDERS, LAYERS
+
+UPPER = [folder for folder in FOLDERS if folder not in LAYERS]
 MAX_LINES = 800
 SUFFIXES = (".h", ".cpp", ".cc", ".c", ".hpp")
 # Scripts are held to the length only.
 OTHER_SUFFIXES = (".py", ".sh")
 INCLUDE = re.compile(r'^\s*#\s*include\s*([<"])([^>"]+)[>"]', re.MULTILINE)
-
-
-def source_files(root):
-    for top in LAYERS + UPPER:
-        for folder, _, names in sorted(os.walk(os.path.join(root, top))):
-            for name in sorted(names):
-                path = os.path.relpath(os.path.join(folder, name), root)
-                if name.endswith(SUFFIXES + OTHER_SUFFIXES):
-                    yield path
 
 
 def is_generated(target):
@@ -40,7 +32,7 @@ def check_include(root, path, quote, target):
     top = path.split(os.sep)[0]
     target_top = target.split("/")[0]
     if quote == "<":
-        if target_top in LAYERS + UPPER and os.path.exists(os.path.join(root, target)):
+        if target_top in FOLDERS and os.path.exists(os.path.join(root, target)):
             return f"{path}: <{target}> is a header of this project and takes quotes"
         return None
     if is_generated(target):
@@ -52,7 +44,7 @@ def check_include(root, path, quote, target):
                 return None
             return f'{path}: "{target}" is to be included from the root, as "{beside}"'
         return None  # a header of a library
-    if target_top not in LAYERS + UPPER:
+    if target_top not in FOLDERS:
         return None
     if top in LAYERS:
         if target_top in UPPER or LAYERS.index(target_top) > LAYERS.index(top):
@@ -82,11 +74,9 @@ def circles(graph):
 
 
 def check(root):
-    errors, graph, count = [], {}, 0
-    for path in source_files(root):
-        count += 1
-        with open(os.path.join(root, path), encoding="utf-8") as stream:
-            text = stream.read()
+    errors, graph = [], {}
+    for path in sourcetree.files(root, FOLDERS, SUFFIXES + OTHER_SUFFIXES):
+        text = sourcetree.read(os.path.join(root, path))
         lines = text.count("\n")
         if lines > MAX_LINES:
             errors.append(f"{path}: {lines} lines, more than {MAX_LINES}")
@@ -100,44 +90,23 @@ def check(root):
             if quote == '"' and os.path.exists(os.path.join(root, target)):
                 graph[path].append(target)
     errors += ["headers in a circle: " + circle for circle in circles(graph)]
-    return errors, count
+    return errors
 
 
-def self_test():
-    with tempfile.TemporaryDirectory() as root:
-        def write(path, text):
-            os.makedirs(os.path.join(root, os.path.dirname(path)), exist_ok=True)
-            with open(os.path.join(root, path), "w", encoding="utf-8") as stream:
-                stream.write(text)
-
-        write("support/A.h", "#pragma once\n")
-        write("canvas/B.h", '#include "support/A.h"\n#include <QWidget>\n')
-        write("tests/t.cpp", '#include "canvas/B.h"\n#include "t.moc"\n')
-        assert check(root) == ([], 3), check(root)
-        write("support/A.h", '#include "canvas/B.h"\n')
-        errors, _ = check(root)
-        assert len(errors) == 2 and "may not include" in errors[0] and "circle" in errors[1], errors
-        write("support/A.h", "\n" * 801)
-        write("canvas/B.h", '#include "C.h"\n#include <support/A.h>\n')
-        write("canvas/C.h", "")
-        errors, _ = check(root)
-        assert len(errors) == 3, errors
-
-
-def main(arguments):
-    if arguments == ["--self-test"]:
-        self_test()
-        return 0
-    if len(arguments) != 1:
-        print(__doc__, file=sys.stderr)
-        return 2
-    errors, count = check(arguments[0])
-    for error in errors:
-        print(error)
-    if count == 0:
-        print(f"no sources under {arguments[0]}")
-    return 1 if errors or count == 0 else 0
+def self_test(tree):
+    tree.write("support/A.h", "#pragma once\n")
+    tree.write("canvas/B.h", '#include "support/A.h"\n#include <QWidget>\n')
+    tree.write("tests/t.cpp", '#include "canvas/B.h"\n#include "t.moc"\n')
+    assert check(tree.root) == [], check(tree.root)
+    tree.write("support/A.h", '#include "canvas/B.h"\n')
+    errors = check(tree.root)
+    assert len(errors) == 2 and "may not include" in errors[0] and "circle" in errors[1], errors
+    tree.write("support/A.h", "\n" * 801)
+    tree.write("canvas/B.h", '#include "C.h"\n#include <support/A.h>\n')
+    tree.write("canvas/C.h", "")
+    errors = check(tree.root)
+    assert len(errors) == 3, errors
 
 
 if __name__ == "__main__":
-    sys.exit(main(sys.argv[1:]))
+    sys.exit(sourcetree.main(__doc__, check, self_test))
