@@ -4,7 +4,7 @@
 #include <QEventLoop>
 #include <QTest>
 
-class tst_EarlyRequests : public QObject
+class tst_earlyrequests : public QObject
 {
     Q_OBJECT
 
@@ -28,19 +28,19 @@ private:
     QList<int> mDone;
 };
 
-void tst_EarlyRequests::cleanup()
+void tst_earlyrequests::cleanup()
 {
     EarlyRequests::clearInstance();
     mDone.clear();
 }
 
-void tst_EarlyRequests::atOnceWithoutHandShakes()
+void tst_earlyrequests::atOnceWithoutHandShakes()
 {
     ask(1);
     QCOMPARE(mDone, QList{1});
 }
 
-void tst_EarlyRequests::afterTheLastHandShakeInTheirOrder()
+void tst_earlyrequests::afterTheLastHandShakeInTheirOrder()
 {
     requests().expectClientId(65);
     requests().expectClientId(36);
@@ -55,7 +55,7 @@ void tst_EarlyRequests::afterTheLastHandShakeInTheirOrder()
     QCOMPARE(mDone, QList({1, 2, 3}));
 }
 
-void tst_EarlyRequests::whatComesMeanwhileStaysBehind()
+void tst_earlyrequests::whatComesMeanwhileStaysBehind()
 {
     requests().expectClientId(65);
     ask(1);
@@ -65,7 +65,7 @@ void tst_EarlyRequests::whatComesMeanwhileStaysBehind()
     QTRY_COMPARE(mDone, QList({1, 2, 3}));
 }
 
-void tst_EarlyRequests::aDialogHoldsNoOtherUp()
+void tst_earlyrequests::aDialogHoldsNoOtherUp()
 {
     requests().expectClientId(65);
     QEventLoop dialog;
@@ -83,7 +83,7 @@ void tst_EarlyRequests::aDialogHoldsNoOtherUp()
     QTRY_COMPARE(mDone, QList({1, 2, 3, 4}));
 }
 
-void tst_EarlyRequests::aSilentServiceHoldsNothingUpForEver()
+void tst_earlyrequests::aSilentServiceHoldsNothingUpForEver()
 {
     requests().expectClientId(71);
     ask(1);
@@ -92,7 +92,7 @@ void tst_EarlyRequests::aSilentServiceHoldsNothingUpForEver()
     QCOMPARE(mDone, QList({1, 2}));
 }
 
-void tst_EarlyRequests::aFloodIsCutOff()
+void tst_earlyrequests::aFloodIsCutOff()
 {
     requests().expectClientId(65);
     for (int i = 0; i < 10 * EarlyRequests::MAX_KEPT; ++i)
@@ -102,7 +102,7 @@ void tst_EarlyRequests::aFloodIsCutOff()
     QCOMPARE(mDone.last(), EarlyRequests::MAX_KEPT - 1);
 }
 
-void tst_EarlyRequests::unknownHandShakes()
+void tst_earlyrequests::unknownHandShakes()
 {
     requests().clientIdCame(65);
     requests().expectClientId(65);
@@ -114,5 +114,5 @@ void tst_EarlyRequests::unknownHandShakes()
     QTRY_COMPARE(mDone, QList{1});
 }
 
-QTEST_GUILESS_MAIN(tst_EarlyRequests)
+QTEST_GUILESS_MAIN(tst_earlyrequests)
 #include "tst_earlyrequests.moc"

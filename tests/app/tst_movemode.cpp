@@ -9,7 +9,7 @@
 #include <QWheelEvent>
 #include <memory>
 
-class tst_MoveMode : public QObject
+class tst_movemode : public QObject
 {
     Q_OBJECT
 
@@ -29,7 +29,7 @@ private:
     std::unique_ptr<QPointingDevice> mDevice{QTest::createTouchDevice()};
 };
 
-void tst_MoveMode::init()
+void tst_movemode::init()
 {
     mWindow = std::make_unique<QWidget>();
     mWindow->setGeometry(100, 100, 600, 500);
@@ -39,7 +39,7 @@ void tst_MoveMode::init()
     mList->setGeometry(10, 100, 200, 300);
 }
 
-void tst_MoveMode::buttonFollowsTheMode()
+void tst_movemode::buttonFollowsTheMode()
 {
     const KSPushbutton* button = mMode->button();
     QVERIFY(!mMode->isOn());
@@ -63,7 +63,7 @@ void tst_MoveMode::buttonFollowsTheMode()
     QCOMPARE(button->buttonState(), KSPushbutton::ButtonRest);
 }
 
-std::unique_ptr<QEvent> tst_MoveMode::event(QEvent::Type type, const QPointF& global) const
+std::unique_ptr<QEvent> tst_movemode::event(QEvent::Type type, const QPointF& global) const
 {
     switch (type) {
     case QEvent::TouchBegin:
@@ -80,7 +80,7 @@ std::unique_ptr<QEvent> tst_MoveMode::event(QEvent::Type type, const QPointF& gl
     }
 }
 
-void tst_MoveMode::endsWithPressesBesideTheList_data()
+void tst_movemode::endsWithPressesBesideTheList_data()
 {
     QTest::addColumn<bool>("isOn");
     QTest::addColumn<QEvent::Type>("type");
@@ -103,7 +103,7 @@ void tst_MoveMode::endsWithPressesBesideTheList_data()
     QTest::newRow("mode off") << false << QEvent::MouseButtonPress << beside << false << false;
 }
 
-void tst_MoveMode::endsWithPressesBesideTheList()
+void tst_movemode::endsWithPressesBesideTheList()
 {
     QFETCH(bool, isOn);
     QFETCH(QEvent::Type, type);
@@ -115,12 +115,12 @@ void tst_MoveMode::endsWithPressesBesideTheList()
     QTEST(mMode->isEndedBy(receiver, sent.get(), mList), "ends");
 }
 
-void tst_MoveMode::touchWithoutPointsEndsNothing()
+void tst_movemode::touchWithoutPointsEndsNothing()
 {
     mMode->setOn(true);
     const QTouchEvent touch(QEvent::TouchBegin, mDevice.get(), Qt::NoModifier, QList<QEventPoint>());
     QVERIFY(!mMode->isEndedBy(mWindow.get(), &touch, mList));
 }
 
-QTEST_MAIN(tst_MoveMode)
+QTEST_MAIN(tst_movemode)
 #include "tst_movemode.moc"

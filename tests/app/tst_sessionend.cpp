@@ -3,7 +3,7 @@
 
 #include <QTest>
 
-class TestSessionEnd : public QObject
+class tst_sessionend : public QObject
 {
     Q_OBJECT
 
@@ -16,7 +16,7 @@ private Q_SLOTS:
 
 using Way = SessionEnd::Way;
 
-void TestSessionEnd::wayFollowsTheSession_data()
+void tst_sessionend::wayFollowsTheSession_data()
 {
     QTest::addColumn<bool>("quits");
     QTest::addColumn<bool>("isAskedFor");
@@ -29,7 +29,7 @@ void TestSessionEnd::wayFollowsTheSession_data()
     QTest::newRow("asked for") << false << true << Way::AskThenHide << false << true;
 }
 
-void TestSessionEnd::wayFollowsTheSession()
+void tst_sessionend::wayFollowsTheSession()
 {
     QFETCH(bool, quits);
     QFETCH(bool, isAskedFor);
@@ -43,7 +43,7 @@ void TestSessionEnd::wayFollowsTheSession()
     QTEST(end.asksFirst(), "asks");
 }
 
-void TestSessionEnd::askingSurvivesTheEndOfTheStart()
+void tst_sessionend::askingSurvivesTheEndOfTheStart()
 {
     SessionEnd end;
     end.beginSession(true);
@@ -53,7 +53,7 @@ void TestSessionEnd::askingSurvivesTheEndOfTheStart()
     QCOMPARE(end.way(), Way::AskThenQuit);
 }
 
-void TestSessionEnd::endOfProcessIsFinal()
+void tst_sessionend::endOfProcessIsFinal()
 {
     SessionEnd end;
     end.setQuits(false);
@@ -66,5 +66,5 @@ void TestSessionEnd::endOfProcessIsFinal()
     QVERIFY(!end.asksFirst());
 }
 
-QTEST_APPLESS_MAIN(TestSessionEnd)
+QTEST_APPLESS_MAIN(tst_sessionend)
 #include "tst_sessionend.moc"

@@ -37,7 +37,7 @@ const char GREY[] = "background-color:transparent; color:rgb(102, 102, 102); fon
 
 } // namespace
 
-class TestToolsBar : public QObject
+class tst_toolsbar : public QObject
 {
     Q_OBJECT
 
@@ -80,7 +80,7 @@ private:
     int m_value = 0;
 };
 
-void TestToolsBar::initTestCase()
+void tst_toolsbar::initTestCase()
 {
     Q_INIT_RESOURCE(TitlerToolResource);
     Q_INIT_RESOURCE(UILibrary);
@@ -89,7 +89,7 @@ void TestToolsBar::initTestCase()
     APPEventFilter::instance();
 }
 
-void TestToolsBar::init()
+void tst_toolsbar::init()
 {
     m_value = 0;
     m_stack = std::make_unique<QUndoStack>();
@@ -102,30 +102,30 @@ void TestToolsBar::init()
     QVERIFY(QTest::qWaitForWindowExposed(m_window.get()));
 }
 
-void TestToolsBar::cleanup()
+void tst_toolsbar::cleanup()
 {
     m_window.reset();
     m_stack.reset();
     APPEventFilter::instance()->unlock();
 }
 
-KSPushbutton* TestToolsBar::button(const char* name) const
+KSPushbutton* tst_toolsbar::button(const char* name) const
 {
     return m_bar->findChild<KSPushbutton*>(QLatin1String(name));
 }
 
-QLabel* TestToolsBar::label(const char* name) const
+QLabel* tst_toolsbar::label(const char* name) const
 {
     return button(name)->findChild<QLabel*>();
 }
 
-void TestToolsBar::openMenu()
+void tst_toolsbar::openMenu()
 {
     QTest::mouseClick(button("Canvas"), Qt::LeftButton);
     QVERIFY(QTest::qWaitForWindowExposed(menu()));
 }
 
-void TestToolsBar::layout()
+void tst_toolsbar::layout()
 {
     const char* names[] = {"Folder", "Text", "Delete", "Undo", "Redo", "SafeArea", "Canvas", "Close"};
     const char* texts[] = {"Folder", "New Text", "Delete", "Undo", "Redo", "Safe Area", "Canvas", "Close"};
@@ -142,7 +142,7 @@ void TestToolsBar::layout()
     QVERIFY(x - 46 <= m_bar->width());
 }
 
-void TestToolsBar::tapsGiveTheirSignal_data()
+void tst_toolsbar::tapsGiveTheirSignal_data()
 {
     QTest::addColumn<QByteArray>("name");
     QTest::addColumn<int>("which");
@@ -155,7 +155,7 @@ void TestToolsBar::tapsGiveTheirSignal_data()
     QTest::newRow("close") << QByteArray("Close") << 6;
 }
 
-void TestToolsBar::tapsGiveTheirSignal()
+void tst_toolsbar::tapsGiveTheirSignal()
 {
     QFETCH(QByteArray, name);
     QFETCH(int, which);
@@ -183,7 +183,7 @@ void TestToolsBar::tapsGiveTheirSignal()
     }
 }
 
-void TestToolsBar::undoLeavesEditingFirst()
+void tst_toolsbar::undoLeavesEditingFirst()
 {
     m_stack->push(new CountingCommand(&m_value));
     QCOMPARE(m_value, 1);
@@ -202,7 +202,7 @@ void TestToolsBar::undoLeavesEditingFirst()
                                  QStringLiteral("leave 0"), QStringLiteral("redone 1")}));
 }
 
-void TestToolsBar::undoFollowsTheStack()
+void tst_toolsbar::undoFollowsTheStack()
 {
     QVERIFY(!button("Undo")->isEnabled());
     QCOMPARE(label("Undo")->styleSheet(), QLatin1String(GREY));
@@ -216,7 +216,7 @@ void TestToolsBar::undoFollowsTheStack()
     QVERIFY(button("Redo")->isEnabled());
 }
 
-void TestToolsBar::resetShowsDisabledUntilTheNextChange()
+void tst_toolsbar::resetShowsDisabledUntilTheNextChange()
 {
     m_stack->push(new CountingCommand(&m_value));
     m_bar->changeBtnStatus(true);
@@ -231,7 +231,7 @@ void TestToolsBar::resetShowsDisabledUntilTheNextChange()
     QVERIFY(!button("Redo")->isEnabled());
 }
 
-void TestToolsBar::deleteFollowsTheSelection()
+void tst_toolsbar::deleteFollowsTheSelection()
 {
     const QImage disabled = button("Delete")->grab().toImage();
     m_bar->changeBtnStatus(true);
@@ -242,7 +242,7 @@ void TestToolsBar::deleteFollowsTheSelection()
     QCOMPARE(button("Delete")->grab().toImage(), disabled);
 }
 
-void TestToolsBar::newTextIsSwitchedOffAndOn()
+void tst_toolsbar::newTextIsSwitchedOffAndOn()
 {
     m_bar->slotDisableNewTextButton(true);
     QVERIFY(!button("Text")->isEnabled());
@@ -262,7 +262,7 @@ void TestToolsBar::newTextIsSwitchedOffAndOn()
     QVERIFY(!button("Text")->isChecked());
 }
 
-void TestToolsBar::folderStates()
+void tst_toolsbar::folderStates()
 {
     m_bar->setFolderButtonEnabled(false);
     QVERIFY(!button("Folder")->isEnabled());
@@ -276,7 +276,7 @@ void TestToolsBar::folderStates()
     QCOMPARE(button("Folder")->buttonState(), KSPushbutton::ButtonRest);
 }
 
-void TestToolsBar::safeAreaStaysSelected()
+void tst_toolsbar::safeAreaStaysSelected()
 {
     QSignalSpy draw(m_bar, &ToolsBar::SafeAreaButtonClickedForDrawRect);
     KSPushbutton* safeArea = button("SafeArea");
@@ -299,7 +299,7 @@ void TestToolsBar::safeAreaStaysSelected()
     QCOMPARE(draw.count(), 4);
 }
 
-void TestToolsBar::pressedLook()
+void tst_toolsbar::pressedLook()
 {
     m_bar->changeBtnStatus(true);
     m_stack->push(new CountingCommand(&m_value));
@@ -316,7 +316,7 @@ void TestToolsBar::pressedLook()
     }
 }
 
-void TestToolsBar::menuOpensUnderTheButton()
+void tst_toolsbar::menuOpensUnderTheButton()
 {
     QSignalSpy shown(m_bar, &ToolsBar::signalShowCanvasMenu);
     openMenu();
@@ -334,7 +334,7 @@ void TestToolsBar::menuOpensUnderTheButton()
     QCOMPARE(shown.count(), 2);
 }
 
-void TestToolsBar::menuReportsItsActions()
+void tst_toolsbar::menuReportsItsActions()
 {
     QSignalSpy clicked(m_bar, &ToolsBar::canvasButtonClicked);
     for (int i = 0; i < 3; ++i) {
@@ -352,7 +352,7 @@ void TestToolsBar::menuReportsItsActions()
     m_bar->hideCanvasMenu();
 }
 
-void TestToolsBar::tappingCanvasAgainClosesTheMenu()
+void tst_toolsbar::tappingCanvasAgainClosesTheMenu()
 {
     openMenu();
     // With the menu up, the window system hands it every press, also one on the button.
@@ -367,7 +367,7 @@ void TestToolsBar::tappingCanvasAgainClosesTheMenu()
     QVERIFY(!menu()->isVisible());
 }
 
-void TestToolsBar::touchBesideTheMenuOnlyCloses()
+void tst_toolsbar::touchBesideTheMenuOnlyCloses()
 {
     QSignalSpy closed(m_bar, &ToolsBar::closeButtonClick);
     KSPushbutton* close = button("Close");
@@ -389,7 +389,7 @@ void TestToolsBar::touchBesideTheMenuOnlyCloses()
 }
 
 // It slid off the button, which opens the menu while the finger is still down.
-void TestToolsBar::fingerThatOpenedTheMenuIsLifted()
+void tst_toolsbar::fingerThatOpenedTheMenuIsLifted()
 {
     KSPushbutton* canvas = button("Canvas");
     QTest::touchEvent(canvas, m_device).press(0, QPoint(60, 20));
@@ -407,7 +407,7 @@ void TestToolsBar::fingerThatOpenedTheMenuIsLifted()
     QVERIFY(!APPEventFilter::instance()->isLock(nullptr, LOCKMETHOD_TOUCH));
 }
 
-void TestToolsBar::mouseBesideTheMenuOnlyCloses()
+void tst_toolsbar::mouseBesideTheMenuOnlyCloses()
 {
     QSignalSpy closed(m_bar, &ToolsBar::closeButtonClick);
     openMenu();
@@ -419,7 +419,7 @@ void TestToolsBar::mouseBesideTheMenuOnlyCloses()
     QCOMPARE(closed.count(), 1);
 }
 
-void TestToolsBar::menuMarksTheItemUnderTheFinger()
+void tst_toolsbar::menuMarksTheItemUnderTheFinger()
 {
     openMenu();
     const QImage plain = menu()->grab().toImage();
@@ -437,7 +437,7 @@ void TestToolsBar::menuMarksTheItemUnderTheFinger()
 }
 
 // A step that comes by a timer leaves nothing to redo, whatever is touched meanwhile.
-void TestToolsBar::disablingAnotherButtonLeavesTheTouchAlone()
+void tst_toolsbar::disablingAnotherButtonLeavesTheTouchAlone()
 {
     QSignalSpy clicked(m_bar, &ToolsBar::folderButtonClick);
     m_bar->changeBtnStatus(true);
@@ -452,7 +452,7 @@ void TestToolsBar::disablingAnotherButtonLeavesTheTouchAlone()
     QCOMPARE(clicked.count(), 1);
 }
 
-void TestToolsBar::disablingLetsGoOfTheTouch()
+void tst_toolsbar::disablingLetsGoOfTheTouch()
 {
     m_bar->changeBtnStatus(true);
     connect(button("Delete"), &QAbstractButton::pressed, m_bar, [this] { m_bar->changeBtnStatus(false); });
@@ -465,7 +465,7 @@ void TestToolsBar::disablingLetsGoOfTheTouch()
     QCOMPARE(clicked.count(), 1);
 }
 
-void TestToolsBar::textsAreTranslated()
+void tst_toolsbar::textsAreTranslated()
 {
     QTranslator translator;
     QVERIFY(translator.load(QStringLiteral(TITLER_TRANSLATION_DIR "/cn.qm")));
@@ -499,7 +499,7 @@ int main(int argc, char** argv)
     file.close();
     qputenv("QT_QPA_PLATFORM", "offscreen:configfile=" + path.toLocal8Bit());
     QApplication app(argc, argv);
-    TestToolsBar test;
+    tst_toolsbar test;
     QTEST_SET_MAIN_SOURCE_PATH
     return QTest::qExec(&test, argc, argv);
 }

@@ -6,7 +6,7 @@
 #include <QTemporaryDir>
 #include <QTest>
 
-class tst_BackgroundPicture : public QObject
+class tst_backgroundpicture : public QObject
 {
     Q_OBJECT
 
@@ -32,7 +32,7 @@ private:
     QTemporaryDir mFolder;
 };
 
-void tst_BackgroundPicture::itemsOfOneFileShareItsPicture()
+void tst_backgroundpicture::itemsOfOneFileShareItsPicture()
 {
     const QString path = write(QStringLiteral("one.bmp"), Qt::red);
     const GraphicsPixmap first(path);
@@ -41,7 +41,7 @@ void tst_BackgroundPicture::itemsOfOneFileShareItsPicture()
     QCOMPARE(first.pixmap().cacheKey(), second.pixmap().cacheKey());
 }
 
-void tst_BackgroundPicture::copiesShareThePicture()
+void tst_backgroundpicture::copiesShareThePicture()
 {
     const QString path = write(QStringLiteral("source.bmp"), Qt::green);
     const QString copy = mFolder.filePath(QStringLiteral("copy.bmp"));
@@ -52,7 +52,7 @@ void tst_BackgroundPicture::copiesShareThePicture()
     QCOMPARE(second.getPixmapPath(), copy);
 }
 
-void tst_BackgroundPicture::changedFileIsReadAnew()
+void tst_backgroundpicture::changedFileIsReadAnew()
 {
     const QString path = write(QStringLiteral("changed.bmp"), Qt::red);
     const auto before = BackgroundPicture::load(path);
@@ -62,7 +62,7 @@ void tst_BackgroundPicture::changedFileIsReadAnew()
     QCOMPARE(before->pixmap().toImage().pixelColor(5, 5), QColor(Qt::red));
 }
 
-void tst_BackgroundPicture::otherBytesOfTheSameSizeAreAnotherPicture()
+void tst_backgroundpicture::otherBytesOfTheSameSizeAreAnotherPicture()
 {
     const QString red = write(QStringLiteral("red.bmp"), Qt::red);
     const QString blue = write(QStringLiteral("blue.bmp"), Qt::blue);
@@ -73,7 +73,7 @@ void tst_BackgroundPicture::otherBytesOfTheSameSizeAreAnotherPicture()
     QCOMPARE(second->pixmap().toImage().pixelColor(5, 5), QColor(Qt::blue));
 }
 
-void tst_BackgroundPicture::nothingIsKeptForLater()
+void tst_backgroundpicture::nothingIsKeptForLater()
 {
     const QString path = write(QStringLiteral("short.bmp"), Qt::red);
     auto picture = BackgroundPicture::load(path);
@@ -82,7 +82,7 @@ void tst_BackgroundPicture::nothingIsKeptForLater()
     QVERIFY(!BackgroundPicture::find(path));
 }
 
-void tst_BackgroundPicture::decodedElsewhereIsTheSame()
+void tst_backgroundpicture::decodedElsewhereIsTheSame()
 {
     const QString path = write(QStringLiteral("thread.bmp"), Qt::magenta);
     const auto picture = BackgroundPicture::load(BackgroundPicture::decode(path));
@@ -90,12 +90,12 @@ void tst_BackgroundPicture::decodedElsewhereIsTheSame()
     QCOMPARE(BackgroundPicture::load(path), picture);
 }
 
-void tst_BackgroundPicture::unreadableIsEmpty()
+void tst_backgroundpicture::unreadableIsEmpty()
 {
     QVERIFY(BackgroundPicture::load(mFolder.filePath(QStringLiteral("missing.png")))->pixmap().isNull());
     QVERIFY(BackgroundPicture::load(mFolder.path())->pixmap().isNull());
     QVERIFY(BackgroundPicture::load(QString())->pixmap().isNull());
 }
 
-QTEST_MAIN(tst_BackgroundPicture)
+QTEST_MAIN(tst_backgroundpicture)
 #include "tst_backgroundpicture.moc"

@@ -13,7 +13,7 @@ using Posted = QList<QPair<int, QString>>;
 
 } // namespace
 
-class tst_CanvasSceneFullDisk : public QObject
+class tst_canvasscene_fulldisk : public QObject
 {
     Q_OBJECT
 
@@ -59,7 +59,7 @@ private:
     }
 };
 
-void tst_CanvasSceneFullDisk::refusedEditIsToldOnceAndSavedWhenThereIsRoom()
+void tst_canvasscene_fulldisk::refusedEditIsToldOnceAndSavedWhenThereIsRoom()
 {
     Canvas canvas;
     const QString path = canvas.folder.filePath("title.xml");
@@ -86,7 +86,7 @@ void tst_CanvasSceneFullDisk::refusedEditIsToldOnceAndSavedWhenThereIsRoom()
     }
 }
 
-void tst_CanvasSceneFullDisk::refusedEditIsSavedWithTheNextChange()
+void tst_canvasscene_fulldisk::refusedEditIsSavedWithTheNextChange()
 {
     Canvas canvas;
     const QString first = canvas.folder.filePath("title.xml");
@@ -112,7 +112,7 @@ void tst_CanvasSceneFullDisk::refusedEditIsSavedWithTheNextChange()
 }
 
 // The list reads a title anew after each save.
-void tst_CanvasSceneFullDisk::refusedEditIsWhatIsReadAgain()
+void tst_canvasscene_fulldisk::refusedEditIsWhatIsReadAgain()
 {
     Canvas canvas;
     const QString path = canvas.folder.filePath("title.xml");
@@ -126,7 +126,7 @@ void tst_CanvasSceneFullDisk::refusedEditIsWhatIsReadAgain()
     QVERIFY(hasText(path, "a"));
 }
 
-void tst_CanvasSceneFullDisk::refusedEditFollowsItsFolder()
+void tst_canvasscene_fulldisk::refusedEditFollowsItsFolder()
 {
     Canvas canvas;
     const QString before = canvas.folder.filePath("before");
@@ -146,5 +146,5 @@ void tst_CanvasSceneFullDisk::refusedEditFollowsItsFolder()
     QVERIFY(!QFileInfo::exists(before));
 }
 
-QTEST_MAIN(tst_CanvasSceneFullDisk)
+QTEST_MAIN(tst_canvasscene_fulldisk)
 #include "tst_canvasscene_fulldisk.moc"

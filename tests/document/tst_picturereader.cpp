@@ -133,7 +133,7 @@ QByteArray encoded(const QImage& image, const char* format, bool isProgressive =
 
 } // namespace
 
-class TestPictureReader : public QObject
+class tst_picturereader : public QObject
 {
     Q_OBJECT
 
@@ -352,5 +352,5 @@ private:
     QTemporaryDir mFolder;
 };
 
-QTEST_GUILESS_MAIN(TestPictureReader)
+QTEST_GUILESS_MAIN(tst_picturereader)
 #include "tst_picturereader.moc"

@@ -98,7 +98,7 @@ std::unique_ptr<Archive> richTitle(const std::string& path)
 
 } // namespace
 
-class TestTitleParser : public QObject
+class tst_titleparser : public QObject
 {
     Q_OBJECT
 
@@ -653,5 +653,5 @@ private:
     TitleParser mParser;
 };
 
-QTEST_GUILESS_MAIN(TestTitleParser)
+QTEST_GUILESS_MAIN(tst_titleparser)
 #include "tst_titleparser.moc"

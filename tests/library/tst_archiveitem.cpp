@@ -7,7 +7,7 @@
 #include <QLabel>
 #include <QTest>
 
-class TestArchiveItem : public QObject
+class tst_archiveitem : public QObject
 {
     Q_OBJECT
 
@@ -40,19 +40,19 @@ constexpr QChar ELLIPSIS(0x2026);
 
 } // namespace
 
-void TestArchiveItem::initTestCase()
+void tst_archiveitem::initTestCase()
 {
     Q_INIT_RESOURCE(UILibrary);
     Q_INIT_RESOURCE(TitlerToolResource);
 }
 
-void TestArchiveItem::init()
+void tst_archiveitem::init()
 {
     mItem = std::make_unique<ArchiveItem>(&mArchive, ArchiveItem::LIST_ITEM);
     mItem->setDragFlagAlignment(DRAGFLAG_RIGHT);
 }
 
-void TestArchiveItem::show(const QString& text)
+void tst_archiveitem::show(const QString& text)
 {
     mArchive.releaseVectorText();
     mArchive.setText({LibraryFixture::makeText(text, 1)});
@@ -62,7 +62,7 @@ void TestArchiveItem::show(const QString& text)
         mItem->initArchiveItemChildWidget();
 }
 
-void TestArchiveItem::oneTextRunsOverTheLines()
+void tst_archiveitem::oneTextRunsOverTheLines()
 {
     const QString text = QStringLiteral("The council votes tonight on the new bridge");
     show(text);
@@ -74,7 +74,7 @@ void TestArchiveItem::oneTextRunsOverTheLines()
         QVERIFY2(fits(*label), qPrintable(label->text()));
 }
 
-void TestArchiveItem::wordLongerThanALine()
+void tst_archiveitem::wordLongerThanALine()
 {
     const QString text = QStringLiteral("快讯快讯快讯快讯快讯快讯快讯快讯快讯快讯");
     show(text);
@@ -83,7 +83,7 @@ void TestArchiveItem::wordLongerThanALine()
     QCOMPARE(mItem->textLines().join(QString()), QString(30, QLatin1Char('W')));
 }
 
-void TestArchiveItem::onlyTheLastLineIsElided()
+void tst_archiveitem::onlyTheLastLineIsElided()
 {
     const QString text = QStringLiteral("word ").repeated(60).trimmed();
     show(text);
@@ -97,7 +97,7 @@ void TestArchiveItem::onlyTheLastLineIsElided()
         QVERIFY2(fits(*label), qPrintable(label->text()));
 }
 
-void TestArchiveItem::handleStandsBesideTheText()
+void tst_archiveitem::handleStandsBesideTheText()
 {
     show(QStringLiteral("word ").repeated(60));
     const QStringList before = mItem->textLines();
@@ -118,5 +118,5 @@ void TestArchiveItem::handleStandsBesideTheText()
     QCOMPARE(mItem->textLines(), before);
 }
 
-QTEST_MAIN(TestArchiveItem)
+QTEST_MAIN(tst_archiveitem)
 #include "tst_archiveitem.moc"

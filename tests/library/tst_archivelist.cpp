@@ -14,7 +14,7 @@
 #include <QUndoStack>
 #include <QWheelEvent>
 
-class tst_ArchiveList : public QObject
+class tst_archivelist : public QObject
 {
     Q_OBJECT
 
@@ -114,7 +114,7 @@ private:
     QList<QString> mCanvas; // stems sent to the canvas; "null" for none
 };
 
-void tst_ArchiveList::init()
+void tst_archivelist::init()
 {
     mLabel = std::make_unique<QLabel>();
     mList = std::make_unique<ArchiveList>(mLabel.get(), false);
@@ -131,14 +131,14 @@ void tst_ArchiveList::init()
     mCanvas.clear();
 }
 
-void tst_ArchiveList::cleanup()
+void tst_archivelist::cleanup()
 {
     mStack.clear();
     mList.reset();
     qunsetenv("K2SYS_FS_REMAIN");
 }
 
-void tst_ArchiveList::opensAFolderInItsOrder()
+void tst_archivelist::opensAFolderInItsOrder()
 {
     const QString folder = threeTitles(QStringLiteral("新闻 order"));
     QCOMPARE(mLabel->text(), QStringLiteral("Folder"));
@@ -155,7 +155,7 @@ void tst_ArchiveList::opensAFolderInItsOrder()
     QCOMPARE(ArchiveController().getLastArchivePath(), folder + QStringLiteral("/c.xml"));
 }
 
-void tst_ArchiveList::gapsAndBlankRows()
+void tst_archivelist::gapsAndBlankRows()
 {
     const QString folder = threeTitles(QStringLiteral("gaps"));
     QFile::remove(folder + QStringLiteral("/a.xml"));
@@ -171,7 +171,7 @@ void tst_ArchiveList::gapsAndBlankRows()
              (QStringList{QStringLiteral("c"), QString(), QStringLiteral("b")}));
 }
 
-void tst_ArchiveList::opensAFileInAFolder()
+void tst_archivelist::opensAFileInAFolder()
 {
     QSignalSpy picker(mList.get(), &ArchiveList::startTemplatePicker);
     const QString folder = threeTitles(QStringLiteral("in file"));
@@ -181,7 +181,7 @@ void tst_ArchiveList::opensAFileInAFolder()
     QCOMPARE(picker.count(), 0);
 }
 
-void tst_ArchiveList::missingFileSelectsTheFirst()
+void tst_archivelist::missingFileSelectsTheFirst()
 {
     const QString folder = threeTitles(QStringLiteral("no file"));
     mList->refreshArchiveListInFile(folder, QStringLiteral("z.xml"));
@@ -189,7 +189,7 @@ void tst_ArchiveList::missingFileSelectsTheFirst()
     QCOMPARE(mCanvas, (QStringList{QStringLiteral("c")}));
 }
 
-void tst_ArchiveList::emptyAndMissingFolders()
+void tst_archivelist::emptyAndMissingFolders()
 {
     QSignalSpy picker(mList.get(), &ArchiveList::startTemplatePicker);
     mList->refreshArchiveList(mFixture.makeFolder(QStringLiteral("empty")));
@@ -202,7 +202,7 @@ void tst_ArchiveList::emptyAndMissingFolders()
     QVERIFY(mList->isEmpty());
 }
 
-void tst_ArchiveList::createRequestOffersATemplate()
+void tst_archivelist::createRequestOffersATemplate()
 {
     QSignalSpy picker(mList.get(), &ArchiveList::startTemplatePicker);
     mContext.createNew = true;
@@ -216,7 +216,7 @@ void tst_ArchiveList::createRequestOffersATemplate()
     QCOMPARE(mList->getSelectedArchive(), item(1));
 }
 
-void tst_ArchiveList::createRequestForAMissingFileSelectsNothing()
+void tst_archivelist::createRequestForAMissingFileSelectsNothing()
 {
     QSignalSpy picker(mList.get(), &ArchiveList::startTemplatePicker);
     mContext.createNew = true;
@@ -236,7 +236,7 @@ void tst_ArchiveList::createRequestForAMissingFileSelectsNothing()
     QCOMPARE(mMessages.take(), (Reports{{112, QStringLiteral("99")}}));
 }
 
-void tst_ArchiveList::fullFolderRefusesNewTitles()
+void tst_archivelist::fullFolderRefusesNewTitles()
 {
     QSignalSpy picker(mList.get(), &ArchiveList::startTemplatePicker);
     const QString folder = mFixture.makeFolder(QStringLiteral("full"));
@@ -266,7 +266,7 @@ void tst_ArchiveList::fullFolderRefusesNewTitles()
     QCOMPARE(mList->count(), 99);
 }
 
-void tst_ArchiveList::fullDiskRefusesNewTitles()
+void tst_archivelist::fullDiskRefusesNewTitles()
 {
     QSignalSpy picker(mList.get(), &ArchiveList::startTemplatePicker);
     mList->refreshArchiveList(threeTitles(QStringLiteral("disk")));
@@ -286,7 +286,7 @@ void tst_ArchiveList::fullDiskRefusesNewTitles()
     QCOMPARE(picker.count(), 1);
 }
 
-void tst_ArchiveList::autoInitTakesTheLastFolder()
+void tst_archivelist::autoInitTakesTheLastFolder()
 {
     const QString folder = threeTitles(QStringLiteral("last"));
     ArchiveController().setLastFolderPath(folder);
@@ -299,7 +299,7 @@ void tst_ArchiveList::autoInitTakesTheLastFolder()
     QCOMPARE(mFolders.take(), (QStringList{QStringLiteral("start last")}));
 }
 
-void tst_ArchiveList::autoInitFallsBackToTheFirstFolder()
+void tst_archivelist::autoInitFallsBackToTheFirstFolder()
 {
     threeTitles(QStringLiteral("first"));
     const QString expected = QString::fromStdString(ArchiveController().getFolderList().front());
@@ -311,7 +311,7 @@ void tst_ArchiveList::autoInitFallsBackToTheFirstFolder()
     }
 }
 
-void tst_ArchiveList::autoInitCanBeInterrupted()
+void tst_archivelist::autoInitCanBeInterrupted()
 {
     const QString many = mFixture.makeFolder(QStringLiteral("interrupted"));
     LibraryFixture::fillFolder(many, numbered(40));
@@ -326,7 +326,7 @@ void tst_ArchiveList::autoInitCanBeInterrupted()
     }
 }
 
-void tst_ArchiveList::tapSelectsAndTellsTheCanvas()
+void tst_archivelist::tapSelectsAndTellsTheCanvas()
 {
     mList->refreshArchiveList(threeTitles(QStringLiteral("tap")));
     QSignalSpy leaving(mList.get(), &ArchiveList::itemSetDefaultState);
@@ -340,7 +340,7 @@ void tst_ArchiveList::tapSelectsAndTellsTheCanvas()
     QVERIFY(item(2)->isSelected() && !item(0)->isSelected());
 }
 
-void tst_ArchiveList::tapOnTheSelectedItemChangesNothing()
+void tst_archivelist::tapOnTheSelectedItemChangesNothing()
 {
     mList->refreshArchiveList(threeTitles(QStringLiteral("twice")));
     mCanvas.clear();
@@ -352,7 +352,7 @@ void tst_ArchiveList::tapOnTheSelectedItemChangesNothing()
     QCOMPARE(mStack.count(), 0);
 }
 
-void tst_ArchiveList::dragScrollsAndSelectsNothing()
+void tst_archivelist::dragScrollsAndSelectsNothing()
 {
     const QString folder = mFixture.makeFolder(QStringLiteral("drag"));
     LibraryFixture::fillFolder(folder, numbered(12));
@@ -367,7 +367,7 @@ void tst_ArchiveList::dragScrollsAndSelectsNothing()
     QVERIFY(mCanvas.isEmpty());
 }
 
-void tst_ArchiveList::longHoldOpensTheMenuAndSelectsNothing()
+void tst_archivelist::longHoldOpensTheMenuAndSelectsNothing()
 {
     mList->refreshArchiveList(threeTitles(QStringLiteral("hold")));
     mCanvas.clear();
@@ -390,7 +390,7 @@ void tst_ArchiveList::longHoldOpensTheMenuAndSelectsNothing()
     QCOMPARE(shown.count(), 1);
 }
 
-void tst_ArchiveList::menuOnEmptyArea()
+void tst_archivelist::menuOnEmptyArea()
 {
     mList->refreshArchiveList(threeTitles(QStringLiteral("area")));
     QTest::mouseClick(mList->viewport(), Qt::RightButton, Qt::NoModifier, QPoint(200, 900));
@@ -405,7 +405,7 @@ void tst_ArchiveList::menuOnEmptyArea()
     QCOMPARE(enabledActions(), (QStringList{QStringLiteral("Create New")}));
 }
 
-void tst_ArchiveList::menuOnAnItem()
+void tst_archivelist::menuOnAnItem()
 {
     mList->refreshArchiveList(threeTitles(QStringLiteral("on item")));
     QTest::mouseClick(item(1), Qt::RightButton, Qt::NoModifier, QPoint(20, 20));
@@ -422,7 +422,7 @@ void tst_ArchiveList::menuOnAnItem()
     QCOMPARE(item(2)->styleSheet(), ArchiveItem::OPERATE_AND_UN_SELECT_STATE);
 }
 
-void tst_ArchiveList::wheelHidesTheMenu()
+void tst_archivelist::wheelHidesTheMenu()
 {
     const QString folder = mFixture.makeFolder(QStringLiteral("wheel"));
     LibraryFixture::fillFolder(folder, numbered(12));
@@ -444,7 +444,7 @@ void tst_ArchiveList::wheelHidesTheMenu()
     QCOMPARE(mList->firstVisibleItem(), 0);
 }
 
-void tst_ArchiveList::saveRefreshesTheItem()
+void tst_archivelist::saveRefreshesTheItem()
 {
     const QString folder = threeTitles(QStringLiteral("saved"));
     mList->refreshArchiveList(folder);
@@ -463,7 +463,7 @@ void tst_ArchiveList::saveRefreshesTheItem()
 }
 
 // The pictures of an earlier visit to the folder may become ready while its rows are still being built.
-void tst_ArchiveList::saveOvertakesTheFirstPicture()
+void tst_archivelist::saveOvertakesTheFirstPicture()
 {
     const QString folder = threeTitles(QStringLiteral("overtaken"));
     mList->refreshArchiveList(folder);
@@ -476,7 +476,7 @@ void tst_ArchiveList::saveOvertakesTheFirstPicture()
     QVERIFY(item(0)->grab().toImage().pixelColor(120, 70) != QColor(Qt::green));
 }
 
-void tst_ArchiveList::textLinesOfOneAndOfManyObjects()
+void tst_archivelist::textLinesOfOneAndOfManyObjects()
 {
     Archive archive;
     archive.setText({LibraryFixture::makeText(QStringLiteral("one\n two"), 1)});
@@ -507,7 +507,7 @@ void tst_ArchiveList::textLinesOfOneAndOfManyObjects()
     QCOMPARE(one.textLines(), (QStringList{QString(), QString(), QString(), QString()}));
 }
 
-void tst_ArchiveList::letterTailsAreWhole_data()
+void tst_archivelist::letterTailsAreWhole_data()
 {
     QTest::addColumn<QString>("family");
     QTest::addColumn<QString>("text");
@@ -518,7 +518,7 @@ void tst_ArchiveList::letterTailsAreWhole_data()
 }
 
 // A line is as high as it is, whatever the families need that stand in for missing characters.
-void tst_ArchiveList::letterTailsAreWhole()
+void tst_archivelist::letterTailsAreWhole()
 {
     QFETCH(const QString, family);
     QFETCH(const QString, text);
@@ -548,7 +548,7 @@ void tst_ArchiveList::letterTailsAreWhole()
     QCOMPARE(inTheLine, ink());
 }
 
-void tst_ArchiveList::itemStyles()
+void tst_archivelist::itemStyles()
 {
     Archive archive;
     ArchiveItem shown(&archive, ArchiveItem::LIST_ITEM);
@@ -569,7 +569,7 @@ void tst_ArchiveList::itemStyles()
     QVERIFY(!narrow.findChild<QGraphicsView*>());
 }
 
-void tst_ArchiveList::itemText_data()
+void tst_archivelist::itemText_data()
 {
     QTest::addColumn<int>("type");
     QTest::addColumn<QSize>("line");
@@ -583,7 +583,7 @@ void tst_ArchiveList::itemText_data()
                             << " QWidget#mTextWidget { background:rgb(38, 38, 38); }" << 8;
 }
 
-void tst_ArchiveList::itemText()
+void tst_archivelist::itemText()
 {
     QFETCH(const int, type);
     QFETCH(const QSize, line);
@@ -606,7 +606,7 @@ void tst_ArchiveList::itemText()
     }
 }
 
-void tst_ArchiveList::cloneOfAnItem()
+void tst_archivelist::cloneOfAnItem()
 {
     auto archive =
         LibraryFixture::makeRecord(QStringLiteral("/f"), QStringLiteral("t"), QStringLiteral("twin"));
@@ -619,7 +619,7 @@ void tst_ArchiveList::cloneOfAnItem()
     QCOMPARE(clone->styleSheet(), ArchiveItem::OPERATE_AND_SELECT_STATE);
 }
 
-void tst_ArchiveList::followsARenamedFolder()
+void tst_archivelist::followsARenamedFolder()
 {
     const QString before = threeTitles(QStringLiteral("before"));
     mFixture.makeFolder(QStringLiteral("after"));
@@ -643,7 +643,7 @@ void tst_ArchiveList::followsARenamedFolder()
     QCOMPARE(mFolders.take(), (QStringList{QStringLiteral("start after")})); // the old one is no more
 }
 
-void tst_ArchiveList::renamedEmptyFolderOffersATemplate()
+void tst_archivelist::renamedEmptyFolderOffersATemplate()
 {
     const QString before = mFixture.makeFolder(QStringLiteral("empty before"));
     const QString after = mFixture.makeFolder(QStringLiteral("empty after"));
@@ -660,7 +660,7 @@ void tst_ArchiveList::renamedEmptyFolderOffersATemplate()
     QVERIFY(mCanvas.isEmpty()); // it is empty already
 }
 
-void tst_ArchiveList::changeOfFolderIsReported()
+void tst_archivelist::changeOfFolderIsReported()
 {
     const QString first = threeTitles(QStringLiteral("one"));
     const QString second = threeTitles(QStringLiteral("two"));
@@ -670,7 +670,7 @@ void tst_ArchiveList::changeOfFolderIsReported()
                                            QStringLiteral("start two")}));
 }
 
-void tst_ArchiveList::synchronizationRemovesWhatTheOrderDoesNotName()
+void tst_archivelist::synchronizationRemovesWhatTheOrderDoesNotName()
 {
     mList->synchronizationFolderFile(); // no folder: nothing
     const QString folder = threeTitles(QStringLiteral("sync"));
@@ -682,7 +682,7 @@ void tst_ArchiveList::synchronizationRemovesWhatTheOrderDoesNotName()
     QVERIFY(QFile::exists(folder + QStringLiteral("/b.xml")));
 }
 
-void tst_ArchiveList::cleaningForgetsTheFolder()
+void tst_archivelist::cleaningForgetsTheFolder()
 {
     mList->refreshArchiveList(threeTitles(QStringLiteral("clean")));
     mList->cleanArchiveList();
@@ -694,7 +694,7 @@ void tst_ArchiveList::cleaningForgetsTheFolder()
     QTRY_VERIFY(mList->findChildren<ArchiveItem*>().isEmpty());
 }
 
-void tst_ArchiveList::selectionIsScrolledIntoView()
+void tst_archivelist::selectionIsScrolledIntoView()
 {
     const QString folder = mFixture.makeFolder(QStringLiteral("scroll"));
     LibraryFixture::fillFolder(folder, numbered(20));
@@ -714,7 +714,7 @@ void tst_ArchiveList::selectionIsScrolledIntoView()
     QCOMPARE(mList->firstVisibleItem(), 0);
 }
 
-void tst_ArchiveList::moveModeIgnoresTaps()
+void tst_archivelist::moveModeIgnoresTaps()
 {
     mList->refreshArchiveList(threeTitles(QStringLiteral("move mode")));
     QVERIFY(!mList->isMoveMode());
@@ -731,7 +731,7 @@ void tst_ArchiveList::moveModeIgnoresTaps()
     QCOMPARE(drag.count(), 2);
 }
 
-void tst_ArchiveList::leftoversOfAKilledSaveAreSwept()
+void tst_archivelist::leftoversOfAKilledSaveAreSwept()
 {
     const QString folder = threeTitles(QStringLiteral("leftovers"));
     const QString aside = folder + QStringLiteral("/.titler-new-0-0-1");
@@ -745,7 +745,7 @@ void tst_ArchiveList::leftoversOfAKilledSaveAreSwept()
     QVERIFY(QFile::exists(folder + QStringLiteral("/a.xml")));
 }
 
-void tst_ArchiveList::language()
+void tst_archivelist::language()
 {
     mList->refreshArchiveList(threeTitles(QStringLiteral("language")));
     QTRY_VERIFY(item(2)->hasChildWidgets());
@@ -764,5 +764,5 @@ void tst_ArchiveList::language()
     mList->setSystemLanFont(QStringLiteral("KST"));
 }
 
-QTEST_MAIN(tst_ArchiveList)
+QTEST_MAIN(tst_archivelist)
 #include "tst_archivelist.moc"

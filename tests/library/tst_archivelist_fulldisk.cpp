@@ -29,7 +29,7 @@ QByteArray read(const QString& path)
 
 } // namespace
 
-class tst_ArchiveListFullDisk : public QObject
+class tst_archivelist_fulldisk : public QObject
 {
     Q_OBJECT
 
@@ -82,19 +82,19 @@ private:
     std::unique_ptr<TitleListFixture> m;
 };
 
-void tst_ArchiveListFullDisk::initTestCase()
+void tst_archivelist_fulldisk::initTestCase()
 {
     mDevice = QTest::createTouchDevice();
     mDevice->setParent(this);
 }
 
-void tst_ArchiveListFullDisk::init()
+void tst_archivelist_fulldisk::init()
 {
     m = std::make_unique<TitleListFixture>(mDevice);
     mMessages.take();
 }
 
-void tst_ArchiveListFullDisk::cleanup()
+void tst_archivelist_fulldisk::cleanup()
 {
     m.reset();
     RefusedWrites::forgetFolder(mFixture.titleRoot().toStdString());
@@ -102,7 +102,7 @@ void tst_ArchiveListFullDisk::cleanup()
 
 // The delete and the Close find a full disk; with room again the folder is opened once more in this process,
 // gets a title and is closed.
-void tst_ArchiveListFullDisk::deleteThatDoesNotFitCostsNoTitle()
+void tst_archivelist_fulldisk::deleteThatDoesNotFitCostsNoTitle()
 {
     const QString folder = abc(QStringLiteral("all deleted"));
     m->open(folder);
@@ -125,7 +125,7 @@ void tst_ArchiveListFullDisk::deleteThatDoesNotFitCostsNoTitle()
     QVERIFY(order.contains("a") && order.contains("c"));
 }
 
-void tst_ArchiveListFullDisk::orderIsToldOnceAndWrittenWhenThereIsRoom()
+void tst_archivelist_fulldisk::orderIsToldOnceAndWrittenWhenThereIsRoom()
 {
     const QString folder = abc(QStringLiteral("told"));
     m->open(folder);
@@ -160,7 +160,7 @@ void tst_ArchiveListFullDisk::orderIsToldOnceAndWrittenWhenThereIsRoom()
     }
 }
 
-void tst_ArchiveListFullDisk::titlesOfADamagedOrderAreListedByName_data()
+void tst_archivelist_fulldisk::titlesOfADamagedOrderAreListedByName_data()
 {
     QTest::addColumn<bool>("exists");
     QTest::addColumn<QByteArray>("order");
@@ -172,7 +172,7 @@ void tst_ArchiveListFullDisk::titlesOfADamagedOrderAreListedByName_data()
     QTest::newRow("no XML") << true << QByteArray(200, '\0');
 }
 
-void tst_ArchiveListFullDisk::titlesOfADamagedOrderAreListedByName()
+void tst_archivelist_fulldisk::titlesOfADamagedOrderAreListedByName()
 {
     QFETCH(bool, exists);
     QFETCH(QByteArray, order);
@@ -189,7 +189,7 @@ void tst_ArchiveListFullDisk::titlesOfADamagedOrderAreListedByName()
     QCOMPARE(LibraryFixture::order(folder), (Names{"a", "b", "c", "d"}));
 }
 
-void tst_ArchiveListFullDisk::folderOfADamagedOrderIsNotCleanedUp()
+void tst_archivelist_fulldisk::folderOfADamagedOrderIsNotCleanedUp()
 {
     const QString folder = abc(QStringLiteral("not cleaned"));
     write(folder + "/.order.xml", "<manifest");
@@ -209,7 +209,7 @@ void tst_ArchiveListFullDisk::folderOfADamagedOrderIsNotCleanedUp()
     }
 }
 
-void tst_ArchiveListFullDisk::orderOfAFullDiskIsShownFromMemory()
+void tst_archivelist_fulldisk::orderOfAFullDiskIsShownFromMemory()
 {
     const QString folder = abc(QStringLiteral("memory"));
     QVERIFY(QFile::remove(folder + "/.order.xml"));
@@ -231,7 +231,7 @@ void tst_ArchiveListFullDisk::orderOfAFullDiskIsShownFromMemory()
     QCOMPARE(LibraryFixture::order(folder), (Names{"b", "a", "c"}));
 }
 
-void tst_ArchiveListFullDisk::wholeOrderKeepsItsMeaning()
+void tst_archivelist_fulldisk::wholeOrderKeepsItsMeaning()
 {
     const QString folder = abc(QStringLiteral("whole"));
     LibraryFixture::writeOrder(folder, {"c", "a"});
@@ -243,7 +243,7 @@ void tst_ArchiveListFullDisk::wholeOrderKeepsItsMeaning()
 }
 
 // A file that the disk refuses to give once must not be taken for one that was deleted.
-void tst_ArchiveListFullDisk::titleThatCouldNotBeReadForAMomentStays()
+void tst_archivelist_fulldisk::titleThatCouldNotBeReadForAMomentStays()
 {
     const QString folder = abc(QStringLiteral("for a moment"));
     const QString title = folder + "/b.xml";
@@ -263,7 +263,7 @@ void tst_ArchiveListFullDisk::titleThatCouldNotBeReadForAMomentStays()
     QCOMPARE(m->stems(), (Names{"a", "b", pasted, "c"}));
 }
 
-void tst_ArchiveListFullDisk::refusedTitlesLeaveNothingAndAreTold()
+void tst_archivelist_fulldisk::refusedTitlesLeaveNothingAndAreTold()
 {
     const QString folder = abc(QStringLiteral("refused"));
     m->open(folder);
@@ -284,5 +284,5 @@ void tst_ArchiveListFullDisk::refusedTitlesLeaveNothingAndAreTold()
     QVERIFY(!QFileInfo::exists(templates + "/UserTemplate_001"));
 }
 
-QTEST_MAIN(tst_ArchiveListFullDisk)
+QTEST_MAIN(tst_archivelist_fulldisk)
 #include "tst_archivelist_fulldisk.moc"

@@ -9,7 +9,7 @@
 using Names = QStringList;
 using List = TitleListFixture;
 
-class tst_ArchiveListLongFolder : public QObject
+class tst_archivelist_longfolder : public QObject
 {
     Q_OBJECT
 
@@ -142,25 +142,25 @@ private:
     std::unique_ptr<TitleListFixture> m;
 };
 
-void tst_ArchiveListLongFolder::initTestCase()
+void tst_archivelist_longfolder::initTestCase()
 {
     mDevice = QTest::createTouchDevice();
     mDevice->setParent(this);
 }
 
-void tst_ArchiveListLongFolder::init()
+void tst_archivelist_longfolder::init()
 {
     m = std::make_unique<TitleListFixture>(mDevice);
     mMessages.take();
     mReports.take();
 }
 
-void tst_ArchiveListLongFolder::cleanup()
+void tst_archivelist_longfolder::cleanup()
 {
     m.reset();
 }
 
-void tst_ArchiveListLongFolder::itemsAreMadeAsTheyComeIntoView()
+void tst_archivelist_longfolder::itemsAreMadeAsTheyComeIntoView()
 {
     openLong();
     QCOMPARE(m->list->count(), TITLES);
@@ -179,7 +179,7 @@ void tst_ArchiveListLongFolder::itemsAreMadeAsTheyComeIntoView()
     QCOMPARE(listed(), stems());
 }
 
-void tst_ArchiveListLongFolder::itemsAreGivenBack()
+void tst_archivelist_longfolder::itemsAreGivenBack()
 {
     openLong();
     scrollThroughAll();
@@ -192,7 +192,7 @@ void tst_ArchiveListLongFolder::itemsAreGivenBack()
     QCOMPARE(m->selected(), 0);
 }
 
-void tst_ArchiveListLongFolder::givenBackItemShowsTheSameAgain()
+void tst_archivelist_longfolder::givenBackItemShowsTheSameAgain()
 {
     openLong();
     m->list->selectArchive(300);
@@ -209,7 +209,7 @@ void tst_ArchiveListLongFolder::givenBackItemShowsTheSameAgain()
     QCOMPARE(m->item(3)->textLines().front(), stem(3));
 }
 
-void tst_ArchiveListLongFolder::selectedItemIsKept()
+void tst_archivelist_longfolder::selectedItemIsKept()
 {
     openLong();
     m->list->moveToWidgetItem(100);
@@ -228,7 +228,7 @@ void tst_ArchiveListLongFolder::selectedItemIsKept()
     QCOMPARE(m->item(102)->styleSheet(), ArchiveItem::UN_OPERATE_AND_SELECT_STATE);
 }
 
-void tst_ArchiveListLongFolder::itemsOfUndoStepsAreKept()
+void tst_archivelist_longfolder::itemsOfUndoStepsAreKept()
 {
     openLong();
     m->list->moveToWidgetItem(100);
@@ -253,7 +253,7 @@ void tst_ArchiveListLongFolder::itemsOfUndoStepsAreKept()
     QTRY_VERIFY(items() <= MOST_ITEMS + MARGIN);
 }
 
-void tst_ArchiveListLongFolder::closingGivesEverythingBack()
+void tst_archivelist_longfolder::closingGivesEverythingBack()
 {
     openLong();
     scrollThroughAll();
@@ -263,7 +263,7 @@ void tst_ArchiveListLongFolder::closingGivesEverythingBack()
     QCOMPARE(m->maximum(), 0);
 }
 
-void tst_ArchiveListLongFolder::closingWhileTitlesAreRead()
+void tst_archivelist_longfolder::closingWhileTitlesAreRead()
 {
     for (int i = 0; i < 5; ++i) {
         const QString folder = openLong();
@@ -278,7 +278,7 @@ void tst_ArchiveListLongFolder::closingWhileTitlesAreRead()
     QVERIFY(QFile::exists(folder + '/' + stem(TITLES - 1) + ".xml"));
 }
 
-void tst_ArchiveListLongFolder::unreadableTitlesDisappear()
+void tst_archivelist_longfolder::unreadableTitlesDisappear()
 {
     const QString folder = makeFolder();
     spoil(folder, 5);
@@ -292,7 +292,7 @@ void tst_ArchiveListLongFolder::unreadableTitlesDisappear()
     QCOMPARE(m->maximum(), (TITLES - 3) * List::ROW - 4 - 997);
 }
 
-void tst_ArchiveListLongFolder::unreadableTitlesAboveTheView()
+void tst_archivelist_longfolder::unreadableTitlesAboveTheView()
 {
     const QString folder = makeFolder();
     for (int number = 120; number < 180; number += 2)
@@ -308,7 +308,7 @@ void tst_ArchiveListLongFolder::unreadableTitlesAboveTheView()
     QCOMPARE(shownStem(m->selected()), selected);
 }
 
-void tst_ArchiveListLongFolder::unreadableTitleInView()
+void tst_archivelist_longfolder::unreadableTitleInView()
 {
     const QString folder = makeFolder();
     spoil(folder, 302);
@@ -323,7 +323,7 @@ void tst_ArchiveListLongFolder::unreadableTitleInView()
         QVERIFY(!item->getArchiveDataPath().isEmpty());
 }
 
-void tst_ArchiveListLongFolder::fileThatGoesLater()
+void tst_archivelist_longfolder::fileThatGoesLater()
 {
     const QString folder = openLong();
     m->list->moveButtonClicked(true); // all titles have been read by now
@@ -339,7 +339,7 @@ void tst_ArchiveListLongFolder::fileThatGoesLater()
     QCOMPARE(m->selected(), 397);
 }
 
-void tst_ArchiveListLongFolder::firstHundredAreMissing()
+void tst_archivelist_longfolder::firstHundredAreMissing()
 {
     const QString folder = makeFolder();
     for (int number = 0; number < 250; ++number)
@@ -358,7 +358,7 @@ void tst_ArchiveListLongFolder::firstHundredAreMissing()
 }
 
 // A saved order that lacks the titles not read yet would lose them.
-void tst_ArchiveListLongFolder::orderIsWholeWhileTitlesAreRead()
+void tst_archivelist_longfolder::orderIsWholeWhileTitlesAreRead()
 {
     const QString folder = openLong();
     m->list->saveArchiveListOrder();
@@ -366,7 +366,7 @@ void tst_ArchiveListLongFolder::orderIsWholeWhileTitlesAreRead()
     QCOMPARE(items(), 7);
 }
 
-void tst_ArchiveListLongFolder::opensATitleFarDown()
+void tst_archivelist_longfolder::opensATitleFarDown()
 {
     const QString folder = makeFolder();
     m->list->refreshArchiveListInFile(folder, stem(350) + ".xml");
@@ -376,7 +376,7 @@ void tst_ArchiveListLongFolder::opensATitleFarDown()
     QVERIFY(items() < 20);
 }
 
-void tst_ArchiveListLongFolder::opensAnUnreadableTitleFarDown()
+void tst_archivelist_longfolder::opensAnUnreadableTitleFarDown()
 {
     const QString folder = makeFolder();
     spoil(folder, 350);
@@ -387,7 +387,7 @@ void tst_ArchiveListLongFolder::opensAnUnreadableTitleFarDown()
     QCOMPARE(LibraryFixture::order(folder), stems()); // only what is saved changes it
 }
 
-void tst_ArchiveListLongFolder::blankRowFarDown()
+void tst_archivelist_longfolder::blankRowFarDown()
 {
     const QString folder = makeFolder();
     Names rows = stems();
@@ -403,7 +403,7 @@ void tst_ArchiveListLongFolder::blankRowFarDown()
     QCOMPARE(LibraryFixture::order(folder), rows);
 }
 
-void tst_ArchiveListLongFolder::savedTitleFarDown()
+void tst_archivelist_longfolder::savedTitleFarDown()
 {
     const QString folder = openLong();
     const auto changed = LibraryFixture::makeRecord(folder, stem(250), QStringLiteral("速報"));
@@ -416,7 +416,7 @@ void tst_ArchiveListLongFolder::savedTitleFarDown()
     QCOMPARE(m->item(250)->grab().toImage().pixelColor(120, 70), QColor(Qt::green));
 }
 
-void tst_ArchiveListLongFolder::renamedFolderKeepsTheSelection()
+void tst_archivelist_longfolder::renamedFolderKeepsTheSelection()
 {
     const QString folder = makeFolder();
     spoil(folder, 150);
@@ -432,7 +432,7 @@ void tst_ArchiveListLongFolder::renamedFolderKeepsTheSelection()
     QTRY_COMPARE(m->list->count(), TITLES - 1);
 }
 
-void tst_ArchiveListLongFolder::fullFolderTakesNoNewTitle()
+void tst_archivelist_longfolder::fullFolderTakesNoNewTitle()
 {
     openLong();
     QSignalSpy picker(m->list, &ArchiveList::startTemplatePicker);
@@ -446,7 +446,7 @@ void tst_ArchiveListLongFolder::fullFolderTakesNoNewTitle()
 }
 
 // The limit counts titles, not rows of which nothing is left.
-void tst_ArchiveListLongFolder::manyUnreadableLeaveRoom()
+void tst_archivelist_longfolder::manyUnreadableLeaveRoom()
 {
     const QString folder = makeFolder();
     for (int number = 50; number < TITLES; ++number)
@@ -460,7 +460,7 @@ void tst_ArchiveListLongFolder::manyUnreadableLeaveRoom()
     QCOMPARE(LibraryFixture::order(folder), listed());
 }
 
-void tst_ArchiveListLongFolder::deleteFarDown()
+void tst_archivelist_longfolder::deleteFarDown()
 {
     const QString folder = openLong();
     m->list->moveToWidgetItem(350);
@@ -483,7 +483,7 @@ void tst_ArchiveListLongFolder::deleteFarDown()
     QCOMPARE(QDir(folder).entryList({QStringLiteral("*.xml")}, QDir::Files).size(), TITLES - 1);
 }
 
-void tst_ArchiveListLongFolder::moveFarDown()
+void tst_archivelist_longfolder::moveFarDown()
 {
     const QString folder = openLong();
     m->list->moveButtonClicked(true);
@@ -500,7 +500,7 @@ void tst_ArchiveListLongFolder::moveFarDown()
     m->list->moveButtonClicked(false);
 }
 
-void tst_ArchiveListLongFolder::languageReachesLateItems()
+void tst_archivelist_longfolder::languageReachesLateItems()
 {
     openLong();
     m->list->setSystemLanFont(QStringLiteral("DFHeiW5-A"));
@@ -512,7 +512,7 @@ void tst_ArchiveListLongFolder::languageReachesLateItems()
 }
 
 // The way of a list that opens the last folder when it is made.
-void tst_ArchiveListLongFolder::loadedByTheThread()
+void tst_archivelist_longfolder::loadedByTheThread()
 {
     const QString folder = makeFolder();
     ArchiveController().setLastFolderPath(folder);
@@ -531,5 +531,5 @@ void tst_ArchiveListLongFolder::loadedByTheThread()
     QCOMPARE(list.archiveItem(3)->textLines().front(), stem(3));
 }
 
-QTEST_MAIN(tst_ArchiveListLongFolder)
+QTEST_MAIN(tst_archivelist_longfolder)
 #include "tst_archivelist_longfolder.moc"

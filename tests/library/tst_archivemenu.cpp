@@ -59,7 +59,7 @@ Names templates(int first, int last)
 
 } // namespace
 
-class tst_ArchiveMenu : public QObject
+class tst_archivemenu : public QObject
 {
     Q_OBJECT
 
@@ -106,17 +106,17 @@ private:
     std::unique_ptr<TitleListFixture> m;
 };
 
-void tst_ArchiveMenu::initTestCase()
+void tst_archivemenu::initTestCase()
 {
     mDevice = QTest::createTouchDevice();
     mDevice->setParent(this);
 }
 
-void tst_ArchiveMenu::cleanupTestCase()
+void tst_archivemenu::cleanupTestCase()
 {
 }
 
-void tst_ArchiveMenu::init()
+void tst_archivemenu::init()
 {
     QDir(templateRoot()).removeRecursively();
     QVERIFY(QDir().mkpath(templateRoot()));
@@ -125,13 +125,13 @@ void tst_ArchiveMenu::init()
     mMessages.take();
 }
 
-void tst_ArchiveMenu::cleanup()
+void tst_archivemenu::cleanup()
 {
     m.reset();
     mEvents.reset();
 }
 
-void tst_ArchiveMenu::siblingsHearOfTheMenuOnce_data()
+void tst_archivemenu::siblingsHearOfTheMenuOnce_data()
 {
     QTest::addColumn<Closing>("closing");
     QTest::newRow("a choice") << Closing([this] { m->choose(ArchiveAction::ACTION_COPY); });
@@ -147,7 +147,7 @@ void tst_ArchiveMenu::siblingsHearOfTheMenuOnce_data()
     });
 }
 
-void tst_ArchiveMenu::siblingsHearOfTheMenuOnce()
+void tst_archivemenu::siblingsHearOfTheMenuOnce()
 {
     QFETCH(Closing, closing);
     openFolder(QStringLiteral("events"), 6);
@@ -162,7 +162,7 @@ void tst_ArchiveMenu::siblingsHearOfTheMenuOnce()
     }
 }
 
-void tst_ArchiveMenu::requestToGiveWayWithoutAMenuIsNothing()
+void tst_archivemenu::requestToGiveWayWithoutAMenuIsNothing()
 {
     openFolder(QStringLiteral("no menu"), 2);
     m->hold(List::PICTURE_X, 60);
@@ -179,7 +179,7 @@ void tst_ArchiveMenu::requestToGiveWayWithoutAMenuIsNothing()
     QVERIFY(!m->list->IsOptionMenuShowing());
 }
 
-void tst_ArchiveMenu::tapsAreLogged()
+void tst_archivemenu::tapsAreLogged()
 {
     openFolder(QStringLiteral("taps"), 4);
     m->tapTitle(2);
@@ -190,7 +190,7 @@ void tst_ArchiveMenu::tapsAreLogged()
     QCOMPARE(newLogLines(), Names{QStringLiteral("[Thumbnail] 200: Select  the 0 Thumbnail")});
 }
 
-void tst_ArchiveMenu::choicesAreLogged_data()
+void tst_archivemenu::choicesAreLogged_data()
 {
     QTest::addColumn<int>("type");
     QTest::addColumn<Names>("lines");
@@ -206,7 +206,7 @@ void tst_ArchiveMenu::choicesAreLogged_data()
     row("template", ArchiveAction::ACTION_ADD_USER, {begin + "Select Add User in the 1 Thumbnail"});
 }
 
-void tst_ArchiveMenu::choicesAreLogged()
+void tst_archivemenu::choicesAreLogged()
 {
     QFETCH(const int, type);
     QFETCH(const Names, lines);
@@ -217,7 +217,7 @@ void tst_ArchiveMenu::choicesAreLogged()
     QCOMPARE(newLogLines(), lines);
 }
 
-void tst_ArchiveMenu::choiceOnEmptyAreaIsLoggedWithTheLastTitle()
+void tst_archivemenu::choiceOnEmptyAreaIsLoggedWithTheLastTitle()
 {
     openFolder(QStringLiteral("choice on nothing"), 3);
     m->hold(List::PICTURE_X, 800);
@@ -226,7 +226,7 @@ void tst_ArchiveMenu::choiceOnEmptyAreaIsLoggedWithTheLastTitle()
 }
 
 // It leaves the canvas for a moment to be written out, which is nothing that the operator did.
-void tst_ArchiveMenu::savingTheShownTitleSelectsNothing()
+void tst_archivemenu::savingTheShownTitleSelectsNothing()
 {
     openFolder(QStringLiteral("shown"), 20);
     m->list->setFixedSize(549, 900);
@@ -250,7 +250,7 @@ void tst_ArchiveMenu::savingTheShownTitleSelectsNothing()
     QCOMPARE(m->takeCanvas(), Names());
 }
 
-void tst_ArchiveMenu::templateIsReportedWithItsFolder()
+void tst_archivemenu::templateIsReportedWithItsFolder()
 {
     PathRecorder recorder;
     openFolder(QStringLiteral("reported"), 2);
@@ -258,7 +258,7 @@ void tst_ArchiveMenu::templateIsReportedWithItsFolder()
     QCOMPARE(recorder.reports, (Reports{{5, templateRoot() + QStringLiteral("/UserTemplate_001")}}));
 }
 
-void tst_ArchiveMenu::fullTemplateListTellsTheFreeName_data()
+void tst_archivemenu::fullTemplateListTellsTheFreeName_data()
 {
     QTest::addColumn<Names>("rows");
     QTest::addColumn<Reports>("messages");
@@ -271,7 +271,7 @@ void tst_ArchiveMenu::fullTemplateListTellsTheFreeName_data()
         << (templates(1, 997) + templates(999, 999)) << Reports{{196, QString()}};
 }
 
-void tst_ArchiveMenu::fullTemplateListTellsTheFreeName()
+void tst_archivemenu::fullTemplateListTellsTheFreeName()
 {
     QFETCH(const Names, rows);
     QFETCH(const Reports, messages);
@@ -283,7 +283,7 @@ void tst_ArchiveMenu::fullTemplateListTellsTheFreeName()
     QCOMPARE(added.size(), messages.isEmpty() ? 1 : 0);
 }
 
-void tst_ArchiveMenu::blankLabelStaysBlank()
+void tst_archivemenu::blankLabelStaysBlank()
 {
     m->label.setText(QStringLiteral("in another language"));
     m->list->translateText();
@@ -296,5 +296,5 @@ void tst_ArchiveMenu::blankLabelStaysBlank()
     QCOMPARE(m->label.text(), QString());
 }
 
-QTEST_MAIN(tst_ArchiveMenu)
+QTEST_MAIN(tst_archivemenu)
 #include "tst_archivemenu.moc"

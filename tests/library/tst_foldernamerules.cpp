@@ -45,7 +45,7 @@ QMap<QString, QByteArray> contents(const QString& folder)
 
 } // namespace
 
-class TestFolderNameRules : public QObject
+class tst_foldernamerules : public QObject
 {
     Q_OBJECT
 
@@ -496,5 +496,5 @@ private:
     LibraryFixture mFixture;
 };
 
-QTEST_MAIN(TestFolderNameRules)
+QTEST_MAIN(tst_foldernamerules)
 #include "tst_foldernamerules.moc"

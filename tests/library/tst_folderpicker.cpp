@@ -3,7 +3,7 @@
 
 #include <QLabel>
 
-class TestFolderPicker : public QObject
+class tst_folderpicker : public QObject
 {
     Q_OBJECT
 
@@ -755,7 +755,7 @@ int main(int argc, char** argv)
     KSInputContext::install();
     QApplication app(argc, argv);
     app.setObjectName(QStringLiteral("Titler"));
-    TestFolderPicker test;
+    tst_folderpicker test;
     QTEST_SET_MAIN_SOURCE_PATH
     return QTest::qExec(&test, argc, argv);
 }

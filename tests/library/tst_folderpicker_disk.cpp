@@ -4,7 +4,7 @@
 
 #include "tests/support/FileSizeLimit.h"
 
-class TestFolderPickerDisk : public QObject
+class tst_folderpicker_disk : public QObject
 {
     Q_OBJECT
 
@@ -73,7 +73,7 @@ int main(int argc, char** argv)
     KSInputContext::install();
     QApplication app(argc, argv);
     app.setObjectName(QStringLiteral("Titler"));
-    TestFolderPickerDisk test;
+    tst_folderpicker_disk test;
     QTEST_SET_MAIN_SOURCE_PATH
     return QTest::qExec(&test, argc, argv);
 }

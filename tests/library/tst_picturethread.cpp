@@ -29,7 +29,7 @@ QImage watchedPicture(QSemaphore& gone)
 
 } // namespace
 
-class tst_PictureThread : public QObject
+class tst_picturethread : public QObject
 {
     Q_OBJECT
 
@@ -51,7 +51,7 @@ private:
     LibraryFixture mFixture;
 };
 
-void tst_PictureThread::finishedStates()
+void tst_picturethread::finishedStates()
 {
     HoldingReporter reporter;
     const auto archive = LibraryFixture::makeRecord(mFixture.makeFolder(QStringLiteral("states")),
@@ -66,7 +66,7 @@ void tst_PictureThread::finishedStates()
     QTRY_VERIFY(thread.isThreadWaiting());
 }
 
-void tst_PictureThread::refusedJobs()
+void tst_picturethread::refusedJobs()
 {
     const auto archive = LibraryFixture::makeRecord(mFixture.makeFolder(QStringLiteral("refused")),
                                                     QStringLiteral("t"), QString());
@@ -78,7 +78,7 @@ void tst_PictureThread::refusedJobs()
     QVERIFY(thread.isThreadWaiting());
 }
 
-void tst_PictureThread::filesAndSizes()
+void tst_picturethread::filesAndSizes()
 {
     TitleReportRecorder reports;
     const QString folder = mFixture.makeFolder(QStringLiteral("sizes"));
@@ -101,7 +101,7 @@ void tst_PictureThread::filesAndSizes()
     QCOMPARE(reports.take(), (Reports{{1, QStringLiteral("t")}}));
 }
 
-void tst_PictureThread::transparentParts()
+void tst_picturethread::transparentParts()
 {
     const QString folder = mFixture.makeFolder(QStringLiteral("transparent"));
     const auto archive = LibraryFixture::makeRecord(folder, QStringLiteral("t"), QString());
@@ -117,7 +117,7 @@ void tst_PictureThread::transparentParts()
     QCOMPARE(small, LibraryFixture::checker());
 }
 
-void tst_PictureThread::jobQueuedAtTheEndIsNeverWritten()
+void tst_picturethread::jobQueuedAtTheEndIsNeverWritten()
 {
     HoldingReporter reporter;
     const QString folder = mFixture.makeFolder(QStringLiteral("dropped"));
@@ -140,7 +140,7 @@ void tst_PictureThread::jobQueuedAtTheEndIsNeverWritten()
     QCOMPARE(reporter.reached.available(), 0);
 }
 
-void tst_PictureThread::jobsAreWrittenInOrder()
+void tst_picturethread::jobsAreWrittenInOrder()
 {
     TitleReportRecorder reports;
     const QString folder = mFixture.makeFolder(QStringLiteral("in order"));
@@ -156,7 +156,7 @@ void tst_PictureThread::jobsAreWrittenInOrder()
     QCOMPARE(reports.take(), expected);
 }
 
-void tst_PictureThread::unwritableFolderIsPassedOver()
+void tst_picturethread::unwritableFolderIsPassedOver()
 {
     TitleReportRecorder reports;
     const auto archive =
@@ -167,7 +167,7 @@ void tst_PictureThread::unwritableFolderIsPassedOver()
     QCOMPARE(reports.take(), (Reports{{1, QStringLiteral("t")}}));
 }
 
-void tst_PictureThread::namesThatLeaveTheFolderAreNotWritten()
+void tst_picturethread::namesThatLeaveTheFolderAreNotWritten()
 {
     const QString folder = mFixture.makeFolder(QStringLiteral("names"));
     const auto archive = LibraryFixture::makeRecord(folder, QStringLiteral("t"), QString());
@@ -180,14 +180,14 @@ void tst_PictureThread::namesThatLeaveTheFolderAreNotWritten()
     QCOMPARE(settledEntries(folder), (QStringList{QStringLiteral("t_240.png"), QStringLiteral("t_960.png")}));
 }
 
-void tst_PictureThread::namesOfTitlesAreNoPictures_data()
+void tst_picturethread::namesOfTitlesAreNoPictures_data()
 {
     QTest::addColumn<bool>("isDeletedMeanwhile");
     QTest::newRow("written") << false;
     QTest::newRow("removed with the title") << true;
 }
 
-void tst_PictureThread::namesOfTitlesAreNoPictures()
+void tst_picturethread::namesOfTitlesAreNoPictures()
 {
     QFETCH(bool, isDeletedMeanwhile);
     HoldingReporter reporter;
@@ -212,14 +212,14 @@ void tst_PictureThread::namesOfTitlesAreNoPictures()
     QCOMPARE(QFile::exists(folder + QStringLiteral("/t_240.png")), !isDeletedMeanwhile);
 }
 
-void tst_PictureThread::deletedTitleKeepsNoPictures_data()
+void tst_picturethread::deletedTitleKeepsNoPictures_data()
 {
     QTest::addColumn<bool>("isBeingWritten");
     QTest::newRow("waiting") << false;
     QTest::newRow("being written") << true;
 }
 
-void tst_PictureThread::deletedTitleKeepsNoPictures()
+void tst_picturethread::deletedTitleKeepsNoPictures()
 {
     QFETCH(bool, isBeingWritten);
     HoldingReporter reporter;
@@ -243,5 +243,5 @@ void tst_PictureThread::deletedTitleKeepsNoPictures()
                           QStringLiteral("kept_960.png")}));
 }
 
-QTEST_GUILESS_MAIN(tst_PictureThread)
+QTEST_GUILESS_MAIN(tst_picturethread)
 #include "tst_picturethread.moc"

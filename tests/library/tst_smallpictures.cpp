@@ -6,7 +6,7 @@
 #include <QTest>
 #include <sys/stat.h>
 
-class tst_SmallPictures : public QObject
+class tst_smallpictures : public QObject
 {
     Q_OBJECT
 
@@ -36,7 +36,7 @@ private:
     QTemporaryDir mFolder;
 };
 
-void tst_SmallPictures::eachPictureComesAtItsPlace()
+void tst_smallpictures::eachPictureComesAtItsPlace()
 {
     SmallPictures pictures(makePictures(60, BOUNDS), BOUNDS);
     QCOMPARE(pictures.count(), 60);
@@ -47,7 +47,7 @@ void tst_SmallPictures::eachPictureComesAtItsPlace()
     QVERIFY(pictures.take(60).isNull());
 }
 
-void tst_SmallPictures::takenBeforeItsTurn()
+void tst_smallpictures::takenBeforeItsTurn()
 {
     const QStringList paths = makePictures(60, BOUNDS);
     for (int round = 0; round < 20; ++round) {
@@ -57,7 +57,7 @@ void tst_SmallPictures::takenBeforeItsTurn()
     }
 }
 
-void tst_SmallPictures::whatIsNoPictureIsNull()
+void tst_smallpictures::whatIsNoPictureIsNull()
 {
     const QString text = mFolder.filePath(QStringLiteral("text.png"));
     QFile file(text);
@@ -72,13 +72,13 @@ void tst_SmallPictures::whatIsNoPictureIsNull()
         QVERIFY(pictures.take(i).isNull());
 }
 
-void tst_SmallPictures::largePicturesAreScaledIntoTheBounds()
+void tst_smallpictures::largePicturesAreScaledIntoTheBounds()
 {
     SmallPictures pictures(makePictures(1, QSize(2400, 300)), BOUNDS);
     QCOMPARE(pictures.take(0).size(), QSize(240, 30));
 }
 
-void tst_SmallPictures::leavingEarlyWaitsForOneOnly()
+void tst_smallpictures::leavingEarlyWaitsForOneOnly()
 {
     const QStringList paths = makePictures(8, QSize(960, 540));
     for (int round = 0; round < 20; ++round) {
@@ -88,5 +88,5 @@ void tst_SmallPictures::leavingEarlyWaitsForOneOnly()
     }
 }
 
-QTEST_GUILESS_MAIN(tst_SmallPictures)
+QTEST_GUILESS_MAIN(tst_smallpictures)
 #include "tst_smallpictures.moc"

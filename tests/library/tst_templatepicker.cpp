@@ -20,7 +20,7 @@
 #include <sys/fsuid.h>
 #include <sys/stat.h>
 
-class TestTemplatePicker : public QObject
+class tst_templatepicker : public QObject
 {
     Q_OBJECT
 
@@ -779,5 +779,5 @@ private:
     std::unique_ptr<TemplatePicker> mPicker;
 };
 
-QTEST_MAIN(TestTemplatePicker)
+QTEST_MAIN(tst_templatepicker)
 #include "tst_templatepicker.moc"

@@ -18,7 +18,7 @@ constexpr QSize BUTTON(100, 80);
 
 } // namespace
 
-class TestTemplateScrollArea : public QObject
+class tst_templatescrollarea : public QObject
 {
     Q_OBJECT
 
@@ -287,5 +287,5 @@ private:
     QList<QPushButton*> mButtons;
 };
 
-QTEST_MAIN(TestTemplateScrollArea)
+QTEST_MAIN(tst_templatescrollarea)
 #include "tst_templatescrollarea.moc"

@@ -30,7 +30,7 @@ QRect inkIn(const QImage& image, const QColor& background = Qt::transparent)
 
 } // namespace
 
-class tst_ThumbnailRender : public QObject
+class tst_thumbnailrender : public QObject
 {
     Q_OBJECT
 
@@ -84,7 +84,7 @@ private:
     LibraryFixture mFixture;
 };
 
-void tst_ThumbnailRender::nullDoesNothing()
+void tst_thumbnailrender::nullDoesNothing()
 {
     ThumbnailRender render;
     QSignalSpy spy(&render, &IThumbnailRender::saveHalfThumbnailsOK);
@@ -94,7 +94,7 @@ void tst_ThumbnailRender::nullDoesNothing()
     QVERIFY(render.makePictureThreadIsFinished());
 }
 
-void tst_ThumbnailRender::fastStageTouchesNoDisk()
+void tst_thumbnailrender::fastStageTouchesNoDisk()
 {
     const QString folder = mFixture.makeFolder(QStringLiteral("fast"));
     const auto archive = LibraryFixture::makeRecord(folder, QStringLiteral("t"), QStringLiteral("Fast"));
@@ -108,7 +108,7 @@ void tst_ThumbnailRender::fastStageTouchesNoDisk()
     QVERIFY(QDir(folder).entryList(QDir::Files | QDir::Hidden).isEmpty());
 }
 
-void tst_ThumbnailRender::fastStageWithoutBackgroundIsTransparent()
+void tst_thumbnailrender::fastStageWithoutBackgroundIsTransparent()
 {
     const auto archive = LibraryFixture::makeRecord(mFixture.makeFolder(QStringLiteral("bare")),
                                                     QStringLiteral("t"), QStringLiteral("Bare"));
@@ -120,7 +120,7 @@ void tst_ThumbnailRender::fastStageWithoutBackgroundIsTransparent()
     QVERIFY(inkIn(fastPicture(render, *archive)).isEmpty());
 }
 
-void tst_ThumbnailRender::fastStageScalesTheBackground()
+void tst_thumbnailrender::fastStageScalesTheBackground()
 {
     const QString folder = mFixture.makeFolder(QStringLiteral("background"));
     const auto archive = LibraryFixture::makeRecord(folder, QStringLiteral("t"), QString());
@@ -137,7 +137,7 @@ void tst_ThumbnailRender::fastStageScalesTheBackground()
     QCOMPARE(moved.pixelColor(180, 60), QColor(Qt::blue));
 }
 
-void tst_ThumbnailRender::fastStageLogsWhereTheTextsAre()
+void tst_thumbnailrender::fastStageLogsWhereTheTextsAre()
 {
     const auto archive = LibraryFixture::makeRecord(mFixture.makeFolder(QStringLiteral("logged")),
                                                     QStringLiteral("t"), QString());
@@ -166,7 +166,7 @@ void tst_ThumbnailRender::fastStageLogsWhereTheTextsAre()
 }
 
 // Black and, other than that of the canvas and the large pictures, opaque.
-void tst_ThumbnailRender::shadowOfTheFastStage()
+void tst_thumbnailrender::shadowOfTheFastStage()
 {
     const auto archive = LibraryFixture::makeRecord(mFixture.makeFolder(QStringLiteral("shadow")),
                                                     QStringLiteral("t"), QString());
@@ -201,7 +201,7 @@ void tst_ThumbnailRender::shadowOfTheFastStage()
     QVERIFY2(fast > large + 20, qPrintable(QStringLiteral("%1 and %2").arg(fast).arg(large)));
 }
 
-void tst_ThumbnailRender::missingBackgroundIsPassedOver()
+void tst_thumbnailrender::missingBackgroundIsPassedOver()
 {
     const QString folder = mFixture.makeFolder(QStringLiteral("missing"));
     const auto archive = LibraryFixture::makeRecord(folder, QStringLiteral("t"), QString());
@@ -218,7 +218,7 @@ void tst_ThumbnailRender::missingBackgroundIsPassedOver()
     QVERIFY(inkIn(fastPicture(render, *archive)).isEmpty());
 }
 
-void tst_ThumbnailRender::hugeBackgroundGivesPicturesOfTheUsualSize()
+void tst_thumbnailrender::hugeBackgroundGivesPicturesOfTheUsualSize()
 {
     const QString folder = mFixture.makeFolder(QStringLiteral("huge"));
     const auto archive = LibraryFixture::makeRecord(folder, QStringLiteral("t"), QStringLiteral("Huge"));
@@ -237,7 +237,7 @@ void tst_ThumbnailRender::hugeBackgroundGivesPicturesOfTheUsualSize()
     QCOMPARE(fastPicture(render, *archive).pixelColor(237, 132).alpha(), 0);
 }
 
-void tst_ThumbnailRender::slowStageWritesFourFiles()
+void tst_thumbnailrender::slowStageWritesFourFiles()
 {
     TitleReportRecorder reports;
     const QString folder = mFixture.makeFolder(QStringLiteral("slow"));
@@ -260,7 +260,7 @@ void tst_ThumbnailRender::slowStageWritesFourFiles()
     }
 }
 
-void tst_ThumbnailRender::slowStageReplacesTheOldBigPicture()
+void tst_thumbnailrender::slowStageReplacesTheOldBigPicture()
 {
     const QString folder = mFixture.makeFolder(QStringLiteral("old"));
     const auto archive = LibraryFixture::makeRecord(folder, QStringLiteral("t"), QString());
@@ -277,7 +277,7 @@ void tst_ThumbnailRender::slowStageReplacesTheOldBigPicture()
     QCOMPARE(slowPicture(*archive, "_1920.png").size(), QSize(1920, 1080));
 }
 
-void tst_ThumbnailRender::slowStageReplacesNothingElse_data()
+void tst_thumbnailrender::slowStageReplacesNothingElse_data()
 {
     QTest::addColumn<QString>("name");
     QTest::newRow("of another folder") << "../neighbour/x.png";
@@ -288,7 +288,7 @@ void tst_ThumbnailRender::slowStageReplacesNothingElse_data()
     QTest::newRow("the order") << ".order.xml";
 }
 
-void tst_ThumbnailRender::slowStageReplacesNothingElse()
+void tst_thumbnailrender::slowStageReplacesNothingElse()
 {
     QFETCH(QString, name);
     const QString neighbour = mFixture.makeFolder(QStringLiteral("neighbour"));
@@ -314,7 +314,7 @@ void tst_ThumbnailRender::slowStageReplacesNothingElse()
 }
 
 // Nobody asks whether it has finished.
-void tst_ThumbnailRender::slowStageDrawsWhileTheEventsGoOn()
+void tst_thumbnailrender::slowStageDrawsWhileTheEventsGoOn()
 {
     const QString folder = mFixture.makeFolder(QStringLiteral("events"));
     paint(folder + QStringLiteral("/bg.png"), QSize(1920, 1080), QColor(20, 90, 40));
@@ -334,7 +334,7 @@ void tst_ThumbnailRender::slowStageDrawsWhileTheEventsGoOn()
     QCOMPARE(QImage(folder + QStringLiteral("/c_1920.png")).pixelColor(5, 5).alpha(), 0);
 }
 
-void tst_ThumbnailRender::waitingWithoutEventsDrawsWhatIsLeft()
+void tst_thumbnailrender::waitingWithoutEventsDrawsWhatIsLeft()
 {
     const QString folder = mFixture.makeFolder(QStringLiteral("blocked"));
     paint(folder + QStringLiteral("/bg.png"), QSize(1920, 1080), QColor(20, 90, 40));
@@ -349,7 +349,7 @@ void tst_ThumbnailRender::waitingWithoutEventsDrawsWhatIsLeft()
     QCOMPARE(QImage(folder + QStringLiteral("/t_1920.png")).pixelColor(5, 5), QColor(20, 90, 40));
 }
 
-void tst_ThumbnailRender::textsStandAtOneAndAHalfTimesTheirPlace()
+void tst_thumbnailrender::textsStandAtOneAndAHalfTimesTheirPlace()
 {
     const QString folder = mFixture.makeFolder(QStringLiteral("places"));
     const auto near = LibraryFixture::makeRecord(folder, QStringLiteral("near"), QString());
@@ -364,7 +364,7 @@ void tst_ThumbnailRender::textsStandAtOneAndAHalfTimesTheirPlace()
     QCOMPARE(farInk.topLeft() - nearInk.topLeft(), QPoint(600, 300));
 }
 
-void tst_ThumbnailRender::textOutsideTheRasterIsHarmless()
+void tst_thumbnailrender::textOutsideTheRasterIsHarmless()
 {
     const auto archive = LibraryFixture::makeRecord(mFixture.makeFolder(QStringLiteral("outside")),
                                                     QStringLiteral("t"), QString());
@@ -375,7 +375,7 @@ void tst_ThumbnailRender::textOutsideTheRasterIsHarmless()
     QVERIFY(inkIn(fastPicture(render, *archive)).isEmpty());
 }
 
-void tst_ThumbnailRender::middlePictureIsTheBigOneReduced()
+void tst_thumbnailrender::middlePictureIsTheBigOneReduced()
 {
     const auto archive = LibraryFixture::makeRecord(mFixture.makeFolder(QStringLiteral("middle")),
                                                     QStringLiteral("t"), QStringLiteral("Half"));
@@ -385,7 +385,7 @@ void tst_ThumbnailRender::middlePictureIsTheBigOneReduced()
     QVERIFY(qAbs(big.width() / 2 - middle.width()) <= 3);
 }
 
-void tst_ThumbnailRender::manyRendersLeaveNothingBehind()
+void tst_thumbnailrender::manyRendersLeaveNothingBehind()
 {
     const auto archive = LibraryFixture::makeRecord(mFixture.makeFolder(QStringLiteral("many")),
                                                     QStringLiteral("t"), QStringLiteral("Many"));
@@ -395,5 +395,5 @@ void tst_ThumbnailRender::manyRendersLeaveNothingBehind()
         QCOMPARE(fastPicture(render, *archive), first);
 }
 
-QTEST_MAIN(tst_ThumbnailRender)
+QTEST_MAIN(tst_thumbnailrender)
 #include "tst_thumbnailrender.moc"

@@ -5,7 +5,7 @@
 
 #include <QTest>
 
-class tst_TitleClipboard : public QObject
+class tst_titleclipboard : public QObject
 {
     Q_OBJECT
 
@@ -20,7 +20,7 @@ private:
     TitleFileOperations mFiles{mController};
 };
 
-void tst_TitleClipboard::emptyPastesNothing()
+void tst_titleclipboard::emptyPastesNothing()
 {
     const QString folder = mFixture.makeFolder(QStringLiteral("empty"));
     TitleClipboard clipboard;
@@ -36,7 +36,7 @@ void tst_TitleClipboard::emptyPastesNothing()
     QVERIFY(QDir(folder).entryList(QDir::Files).isEmpty());
 }
 
-void tst_TitleClipboard::copySurvivesItsSource()
+void tst_titleclipboard::copySurvivesItsSource()
 {
     const QString folder = mFixture.makeFolder(QStringLiteral("copy"));
     const auto source = LibraryFixture::makeRecord(folder, QStringLiteral("s"), QStringLiteral("Copy me"));
@@ -54,7 +54,7 @@ void tst_TitleClipboard::copySurvivesItsSource()
         QVERIFY(QFile::exists(QString::fromStdString(made->getPath())));
 }
 
-void tst_TitleClipboard::laterCopyTakesTheFirstOnesPlace()
+void tst_titleclipboard::laterCopyTakesTheFirstOnesPlace()
 {
     const QString folder = mFixture.makeFolder(QStringLiteral("later"));
     const auto first = LibraryFixture::makeRecord(folder, QStringLiteral("a"), QStringLiteral("First"));
@@ -71,5 +71,5 @@ void tst_TitleClipboard::laterCopyTakesTheFirstOnesPlace()
     QVERIFY(!text.contains("First"));
 }
 
-QTEST_MAIN(tst_TitleClipboard)
+QTEST_MAIN(tst_titleclipboard)
 #include "tst_titleclipboard.moc"

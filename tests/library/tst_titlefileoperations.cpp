@@ -49,7 +49,7 @@ private:
 
 } // namespace
 
-class tst_TitleFileOperations : public QObject
+class tst_titlefileoperations : public QObject
 {
     Q_OBJECT
 
@@ -88,7 +88,7 @@ private:
     TitleFileOperations mFiles{mController};
 };
 
-void tst_TitleFileOperations::thumbnailNames()
+void tst_titlefileoperations::thumbnailNames()
 {
     QCOMPARE(TitlerUtility::getThumbnailNameFromTitlePath("/a/b/title.xml", "_960.png"), "title_960.png");
     QCOMPARE(TitlerUtility::getThumbnailPathFromTitlePath("/a/b/title.xml", "x.png"), "/a/b/x.png");
@@ -96,7 +96,7 @@ void tst_TitleFileOperations::thumbnailNames()
     QCOMPARE(TitlerUtility::getThumbnailNameFromTitlePath("/報/題.xml", "_1920.png"), "題_1920.png");
 }
 
-void tst_TitleFileOperations::freeStemSkipsTakenNames()
+void tst_titlefileoperations::freeStemSkipsTakenNames()
 {
     const QString folder = mFixture.makeFolder(QStringLiteral("stems"));
     const QDateTime now(QDate(2026, 1, 2), QTime(3, 4, 5, 998));
@@ -106,14 +106,14 @@ void tst_TitleFileOperations::freeStemSkipsTakenNames()
     QCOMPARE(TitleFileOperations::freeStem(folder, now), QStringLiteral("20260102030406000"));
 }
 
-void tst_TitleFileOperations::emptyFolderMakesNothing()
+void tst_titlefileoperations::emptyFolderMakesNothing()
 {
     const Archive archive;
     QVERIFY(!mFiles.createFromTemplate(QString(), archive));
     QVERIFY(!mFiles.createFromCopy(QString(), archive, TitlePictures()));
 }
 
-void tst_TitleFileOperations::presetKeepsItsBackground()
+void tst_titlefileoperations::presetKeepsItsBackground()
 {
     const QString templates = mFixture.makeFolder(QStringLiteral("preset source"));
     const QString folder = mFixture.makeFolder(QStringLiteral("preset target"));
@@ -142,7 +142,7 @@ void tst_TitleFileOperations::presetKeepsItsBackground()
     QCOMPARE(loaded.text().front()->getText(), std::string("Preset"));
 }
 
-void tst_TitleFileOperations::ownBackgroundIsCopiedUnderNewNames()
+void tst_titlefileoperations::ownBackgroundIsCopiedUnderNewNames()
 {
     const QString templates = mFixture.makeFolder(QStringLiteral("own source"));
     const QString folder = mFixture.makeFolder(QStringLiteral("own 目标"));
@@ -164,7 +164,7 @@ void tst_TitleFileOperations::ownBackgroundIsCopiedUnderNewNames()
     QCOMPARE(readFile(made->getFullPathOfBgResourceBig()), QByteArray("/t_source_1920.jpe"));
 }
 
-void tst_TitleFileOperations::thumbnailWithoutExtensionSkipsTheBackground()
+void tst_titlefileoperations::thumbnailWithoutExtensionSkipsTheBackground()
 {
     const QString folder = mFixture.makeFolder(QStringLiteral("no extension"));
     auto source = LibraryFixture::makeRecord(folder, QStringLiteral("t"), QStringLiteral("T"));
@@ -184,7 +184,7 @@ void tst_TitleFileOperations::thumbnailWithoutExtensionSkipsTheBackground()
     QCOMPARE(readFile(other + QStringLiteral("/old.png")), QByteArray("of another title"));
 }
 
-void tst_TitleFileOperations::copySurvivesItsSource()
+void tst_titlefileoperations::copySurvivesItsSource()
 {
     const QString folder = mFixture.makeFolder(QStringLiteral("copy"));
     const auto source = LibraryFixture::makeRecord(folder, QStringLiteral("s"), QStringLiteral("Copy me"));
@@ -210,7 +210,7 @@ void tst_TitleFileOperations::copySurvivesItsSource()
     }
 }
 
-void tst_TitleFileOperations::copyWithoutPicturesMakesTheTitleAlone()
+void tst_titlefileoperations::copyWithoutPicturesMakesTheTitleAlone()
 {
     const QString folder = mFixture.makeFolder(QStringLiteral("bare copy"));
     const auto source = LibraryFixture::makeRecord(folder, QStringLiteral("s"), QStringLiteral("Bare"));
@@ -220,7 +220,7 @@ void tst_TitleFileOperations::copyWithoutPicturesMakesTheTitleAlone()
     QCOMPARE(QDir(folder).entryList(QDir::Files).size(), 1);
 }
 
-void tst_TitleFileOperations::noFileIsLeftAside()
+void tst_titlefileoperations::noFileIsLeftAside()
 {
     const QString folder = mFixture.makeFolder(QStringLiteral("aside"));
     const auto source = LibraryFixture::makeRecord(folder, QStringLiteral("s"), QStringLiteral("A"));
@@ -230,7 +230,7 @@ void tst_TitleFileOperations::noFileIsLeftAside()
     QCOMPARE(settledEntries(folder).size(), 5);
 }
 
-void tst_TitleFileOperations::templateFolderThatCannotBeMadeIsLogged()
+void tst_titlefileoperations::templateFolderThatCannotBeMadeIsLogged()
 {
     const QString folder = mFixture.makeFolder(QStringLiteral("no template folder"));
     const auto source = LibraryFixture::makeRecord(folder, QStringLiteral("s"), QStringLiteral("A"));
@@ -250,7 +250,7 @@ void tst_TitleFileOperations::templateFolderThatCannotBeMadeIsLogged()
 }
 
 // The name is chosen from an order file, which may have been unreadable.
-void tst_TitleFileOperations::templateThatIsThereStays()
+void tst_titlefileoperations::templateThatIsThereStays()
 {
     const QString folder = mFixture.makeFolder(QStringLiteral("templates"));
     const auto first = LibraryFixture::makeRecord(folder, QStringLiteral("s"), QStringLiteral("first"));
@@ -267,5 +267,5 @@ void tst_TitleFileOperations::templateThatIsThereStays()
     QVERIFY(mFiles.createUserTemplate(folder, QStringLiteral("UserTemplate_001"), *second));
 }
 
-QTEST_GUILESS_MAIN(tst_TitleFileOperations)
+QTEST_GUILESS_MAIN(tst_titlefileoperations)
 #include "tst_titlefileoperations.moc"

@@ -6,7 +6,7 @@
 #include <QTest>
 #include <memory>
 
-class tst_TitleSelection : public QObject
+class tst_titleselection : public QObject
 {
     Q_OBJECT
 
@@ -16,7 +16,7 @@ private Q_SLOTS:
     void destroyedItemsAreForgotten();
 };
 
-void tst_TitleSelection::looksFollowTheMarks()
+void tst_titleselection::looksFollowTheMarks()
 {
     Archive record;
     ArchiveItem first(&record, ArchiveItem::LIST_ITEM, nullptr);
@@ -41,7 +41,7 @@ void tst_TitleSelection::looksFollowTheMarks()
     QCOMPARE(first.styleSheet(), ArchiveItem::UN_OPERATE_AND_UN_SELECT_STATE);
 }
 
-void tst_TitleSelection::nullChangesNothing()
+void tst_titleselection::nullChangesNothing()
 {
     Archive record;
     ArchiveItem item(&record, ArchiveItem::LIST_ITEM, nullptr);
@@ -58,7 +58,7 @@ void tst_TitleSelection::nullChangesNothing()
     QCOMPARE(item.styleSheet(), ArchiveItem::OPERATE_AND_SELECT_STATE);
 }
 
-void tst_TitleSelection::destroyedItemsAreForgotten()
+void tst_titleselection::destroyedItemsAreForgotten()
 {
     Archive record;
     auto item = std::make_unique<ArchiveItem>(&record, ArchiveItem::LIST_ITEM, nullptr);
@@ -70,5 +70,5 @@ void tst_TitleSelection::destroyedItemsAreForgotten()
     QVERIFY(!selection.operation());
 }
 
-QTEST_MAIN(tst_TitleSelection)
+QTEST_MAIN(tst_titleselection)
 #include "tst_titleselection.moc"

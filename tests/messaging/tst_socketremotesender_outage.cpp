@@ -51,7 +51,7 @@ std::vector<std::unique_ptr<TestSocket>> fillBacklog()
 
 } // namespace
 
-class TestSenderOutage : public QObject
+class tst_socketremotesender_outage : public QObject
 {
     Q_OBJECT
 
@@ -78,7 +78,7 @@ private:
     int m_linesBefore = 0;
 };
 
-void TestSenderOutage::initTestCase()
+void tst_socketremotesender_outage::initTestCase()
 {
     TestPorts::useFreeOffset();
     qputenv("K2SYS_LOG_DIR", m_logs.path().toUtf8());
@@ -86,25 +86,25 @@ void TestSenderOutage::initTestCase()
     std::signal(SIGPIPE, SIG_DFL); // a write that raises it ends this program
 }
 
-void TestSenderOutage::cleanupTestCase()
+void tst_socketremotesender_outage::cleanupTestCase()
 {
     UNINIT_LOGGING();
 }
 
-void TestSenderOutage::init()
+void tst_socketremotesender_outage::init()
 {
     m_linesBefore = 0;
     m_linesBefore = logLines();
 }
 
 // Since the test began.
-int TestSenderOutage::logLines() const
+int tst_socketremotesender_outage::logLines() const
 {
     QFile log(m_logs.filePath("k2_ope_debug.log"));
     return log.open(QIODevice::ReadOnly) ? int(log.readAll().count('\n')) - m_linesBefore : 0;
 }
 
-void TestSenderOutage::aPeerThatDoesNotReadHoldsNobodyUp()
+void tst_socketremotesender_outage::aPeerThatDoesNotReadHoldsNobodyUp()
 {
     TestListener listener(PEER);
     SocketRemoteSender sender(4);
@@ -120,7 +120,7 @@ void TestSenderOutage::aPeerThatDoesNotReadHoldsNobodyUp()
     QCOMPARE(logLines(), 1);
 }
 
-void TestSenderOutage::aPeerThatReadsAgainGetsTheNewestCalls()
+void tst_socketremotesender_outage::aPeerThatReadsAgainGetsTheNewestCalls()
 {
     TestListener listener(PEER);
     SocketRemoteSender sender(4);
@@ -154,7 +154,7 @@ void TestSenderOutage::aPeerThatReadsAgainGetsTheNewestCalls()
     QCOMPARE(logLines(), 2);
 }
 
-void TestSenderOutage::aPeerThatWasStartedAnewIsReached()
+void tst_socketremotesender_outage::aPeerThatWasStartedAnewIsReached()
 {
     SocketRemoteSender sender(4);
     for (int start = 0; start < 3; ++start) {
@@ -175,7 +175,7 @@ void TestSenderOutage::aPeerThatWasStartedAnewIsReached()
     QCOMPARE(logLines(), 0);
 }
 
-void TestSenderOutage::aStuckPeerThatWasStartedAnewIsReached()
+void tst_socketremotesender_outage::aStuckPeerThatWasStartedAnewIsReached()
 {
     SocketRemoteSender sender(4);
     {
@@ -199,7 +199,7 @@ void TestSenderOutage::aStuckPeerThatWasStartedAnewIsReached()
     QCOMPARE(method, qint64(FLOOD));
 }
 
-void TestSenderOutage::aPeerThatClosesEachConnectionEndsTheTry()
+void tst_socketremotesender_outage::aPeerThatClosesEachConnectionEndsTheTry()
 {
     TestListener listener(PEER);
     SocketRemoteSender sender(4);
@@ -222,7 +222,7 @@ void TestSenderOutage::aPeerThatClosesEachConnectionEndsTheTry()
     closer.join();
 }
 
-void TestSenderOutage::nobodyListens()
+void tst_socketremotesender_outage::nobodyListens()
 {
     SocketRemoteSender sender(4);
     QVERIFY(!sender.beginConnect(PEER));
@@ -237,7 +237,7 @@ void TestSenderOutage::nobodyListens()
     QCOMPARE(methodOf(peer.read(SocketFrame::FRAME_SIZE)), qint64(77));
 }
 
-void TestSenderOutage::connectingIsGivenUp()
+void tst_socketremotesender_outage::connectingIsGivenUp()
 {
     TestListener listener(PEER);
     const auto fillers = fillBacklog();
@@ -259,7 +259,7 @@ void TestSenderOutage::connectingIsGivenUp()
     QTRY_COMPARE_WITH_TIMEOUT(logLines(), 1, 10 * SocketRemoteSender::CONNECT_TIMEOUT_MS);
 }
 
-void TestSenderOutage::callsWaitForAListenerWithoutRoom()
+void tst_socketremotesender_outage::callsWaitForAListenerWithoutRoom()
 {
     TestListener listener(PEER);
     auto fillers = fillBacklog();
@@ -284,7 +284,7 @@ void TestSenderOutage::callsWaitForAListenerWithoutRoom()
     QCOMPARE(logLines(), 0);
 }
 
-void TestSenderOutage::endingWaitsForWhatIsOnItsWay()
+void tst_socketremotesender_outage::endingWaitsForWhatIsOnItsWay()
 {
     TestListener listener(PEER);
     auto sender = std::make_unique<SocketRemoteSender>(4);
@@ -311,7 +311,7 @@ void TestSenderOutage::endingWaitsForWhatIsOnItsWay()
     QCOMPARE(last, qint64(sent));
 }
 
-void TestSenderOutage::endingDoesNotWaitForAStuckPeer()
+void tst_socketremotesender_outage::endingDoesNotWaitForAStuckPeer()
 {
     TestListener listener(PEER);
     auto sender = std::make_unique<SocketRemoteSender>(4);
@@ -327,7 +327,7 @@ void TestSenderOutage::endingDoesNotWaitForAStuckPeer()
     QVERIFY(timer.elapsed() < 5 * SocketRemoteSender::FINISH_TIMEOUT_MS);
 }
 
-void TestSenderOutage::endingWhileConnecting()
+void tst_socketremotesender_outage::endingWhileConnecting()
 {
     TestListener listener(PEER);
     const auto fillers = fillBacklog();
@@ -342,5 +342,5 @@ void TestSenderOutage::endingWhileConnecting()
     QVERIFY2(timer.elapsed() < MOST_GUI_MS, qPrintable(QString::number(timer.elapsed())));
 }
 
-QTEST_GUILESS_MAIN(TestSenderOutage)
+QTEST_GUILESS_MAIN(tst_socketremotesender_outage)
 #include "tst_socketremotesender_outage.moc"

@@ -7,7 +7,7 @@
 
 #include <QLabel>
 
-class TestColorPalette : public QObject
+class tst_colorpalette : public QObject
 {
     Q_OBJECT
 
@@ -45,7 +45,7 @@ private:
     std::unique_ptr<QSignalSpy> m_sent;
 };
 
-void TestColorPalette::init()
+void tst_colorpalette::init()
 {
     m_palette = std::make_unique<ColorPalette>(nullptr);
     m_palette->setTitlerWindowRect(QRect(0, 0, 1920, 1080));
@@ -55,13 +55,13 @@ void TestColorPalette::init()
     QVERIFY(QTest::qWaitForWindowExposed(m_palette.get()));
 }
 
-void TestColorPalette::cleanup()
+void tst_colorpalette::cleanup()
 {
     m_sent.reset();
     m_palette.reset();
 }
 
-void TestColorPalette::table()
+void tst_colorpalette::table()
 {
     const QList<QString>& colors = m_palette->colors();
     QCOMPARE(colors.size(), 30);
@@ -76,7 +76,7 @@ void TestColorPalette::table()
 }
 
 // The picture of the frame is round; beside it nothing of the system's colours shows.
-void TestColorPalette::cornersAreDark()
+void tst_colorpalette::cornersAreDark()
 {
     const QImage picture = m_palette->grab().toImage();
     const QRect area = picture.rect();
@@ -84,7 +84,7 @@ void TestColorPalette::cornersAreDark()
         QVERIFY2(qGray(picture.pixel(corner)) < 64, qPrintable(picture.pixelColor(corner).name()));
 }
 
-void TestColorPalette::opensOnItsColor()
+void tst_colorpalette::opensOnItsColor()
 {
     m_palette->setCurrentColor(QStringLiteral("#C80000"));
     QCOMPARE(m_palette->currentIndex(), 10);
@@ -95,7 +95,7 @@ void TestColorPalette::opensOnItsColor()
     QVERIFY(m_sent->isEmpty());
 }
 
-void TestColorPalette::opensOnAnotherColor()
+void tst_colorpalette::opensOnAnotherColor()
 {
     m_palette->setCurrentColor(QStringLiteral("#C80000"));
     m_palette->setCurrentColor(QStringLiteral("#123456"));
@@ -107,7 +107,7 @@ void TestColorPalette::opensOnAnotherColor()
     QCOMPARE(*m_sent, (QList<QVariantList>{{"#000000", 0}, {"#123456", 2}}));
 }
 
-void TestColorPalette::tapPreviews()
+void tst_colorpalette::tapPreviews()
 {
     m_palette->setCurrentColor(QStringLiteral("#FFFFFF"));
     m_environment->tap(button(12));
@@ -120,7 +120,7 @@ void TestColorPalette::tapPreviews()
     QVERIFY(m_palette->isVisible());
 }
 
-void TestColorPalette::okSendsTheChoice()
+void tst_colorpalette::okSendsTheChoice()
 {
     m_palette->setCurrentColor(QStringLiteral("#FFFFFF"));
     m_environment->tap(button(14));
@@ -129,7 +129,7 @@ void TestColorPalette::okSendsTheChoice()
     QVERIFY(!m_palette->isVisible());
 }
 
-void TestColorPalette::cancelSendsWhatWasThere()
+void tst_colorpalette::cancelSendsWhatWasThere()
 {
     m_palette->setCurrentColor(QStringLiteral("#273F69"));
     m_environment->tap(button(14));
@@ -139,7 +139,7 @@ void TestColorPalette::cancelSendsWhatWasThere()
     QVERIFY(!m_palette->isVisible());
 }
 
-void TestColorPalette::escapeIsCancel()
+void tst_colorpalette::escapeIsCancel()
 {
     m_palette->setCurrentColor(QStringLiteral("#273F69"));
     QTest::keyClick(m_palette.get(), Qt::Key_Escape);
@@ -148,7 +148,7 @@ void TestColorPalette::escapeIsCancel()
     QCOMPARE(m_sent->size(), 1);
 }
 
-void TestColorPalette::pressedLook()
+void tst_colorpalette::pressedLook()
 {
     m_palette->setCurrentColor(QStringLiteral("#FFFFFF"));
     for (const int index : {0, 7}) {
@@ -164,7 +164,7 @@ void TestColorPalette::pressedLook()
     QVERIFY(m_sent->isEmpty());
 }
 
-void TestColorPalette::dragRules_data()
+void tst_colorpalette::dragRules_data()
 {
     QTest::addColumn<QPoint>("target");
     QTest::addColumn<QPoint>("result");
@@ -183,14 +183,14 @@ void TestColorPalette::dragRules_data()
     QTest::newRow("just inside") << QPoint(1, 746) << QPoint(1, 746);
 }
 
-void TestColorPalette::dragRules()
+void tst_colorpalette::dragRules()
 {
     QFETCH(QPoint, target);
     QTEST(FlickMotion::slideInside(target, QPoint(640, 350), QRect(0, 0, 1920, 1080), QSize(640, 333)),
           "result");
 }
 
-void TestColorPalette::fingerDrags_data()
+void tst_colorpalette::fingerDrags_data()
 {
     QTest::addColumn<bool>("touch");
     QTest::addColumn<QPoint>("start"); // in the palette
@@ -199,7 +199,7 @@ void TestColorPalette::fingerDrags_data()
     QTest::newRow("mouse") << false << QPoint(20, 300);
 }
 
-void TestColorPalette::fingerDrags()
+void tst_colorpalette::fingerDrags()
 {
     QFETCH(bool, touch);
     QFETCH(QPoint, start);
@@ -234,7 +234,7 @@ void TestColorPalette::fingerDrags()
     QVERIFY(m_sent->isEmpty());
 }
 
-void TestColorPalette::buttonsDoNotDrag()
+void tst_colorpalette::buttonsDoNotDrag()
 {
     ColorButton* each = button(3);
     const QPoint before = m_palette->pos();
@@ -244,7 +244,7 @@ void TestColorPalette::buttonsDoNotDrag()
     QCOMPARE(m_palette->pos(), before);
 }
 
-void TestColorPalette::masksTakeTheTouches()
+void tst_colorpalette::masksTakeTheTouches()
 {
     m_palette->showDialogMask(true);
     QVERIFY(!m_palette->testAttribute(Qt::WA_AcceptTouchEvents));
@@ -259,7 +259,7 @@ void TestColorPalette::masksTakeTheTouches()
     QCOMPARE(m_palette->childAt(button(0)->geometry().center()), button(0));
 }
 
-void TestColorPalette::buttonsStandBetweenTheLines()
+void tst_colorpalette::buttonsStandBetweenTheLines()
 {
     QCOMPARE(m_palette->size(), QSize(640, 333));
     for (int i = 0; i < 30; ++i) {
@@ -277,5 +277,5 @@ void TestColorPalette::buttonsStandBetweenTheLines()
     }
 }
 
-QTEST_MAIN(TestColorPalette)
+QTEST_MAIN(tst_colorpalette)
 #include "tst_colorpalette.moc"

@@ -10,7 +10,7 @@
 
 #include <QApplication>
 
-class TestSizeToolBoxKeyboard : public QObject
+class tst_sizetoolbox_keyboard : public QObject
 {
     Q_OBJECT
 
@@ -54,7 +54,7 @@ private:
     QLineEdit* m_other = nullptr;
 };
 
-void TestSizeToolBoxKeyboard::init()
+void tst_sizetoolbox_keyboard::init()
 {
     m_context = KSInputContext::instance();
     QVERIFY(m_context);
@@ -73,14 +73,14 @@ void TestSizeToolBoxKeyboard::init()
     m_service.shown.clear();
 }
 
-void TestSizeToolBoxKeyboard::cleanup()
+void tst_sizetoolbox_keyboard::cleanup()
 {
     m_window.reset();
     m_context->setKeyBoardController(nullptr);
 }
 
 // What the service sends at the end: the whole text, then the key.
-void TestSizeToolBoxKeyboard::type(const wchar_t* text, int key)
+void tst_sizetoolbox_keyboard::type(const wchar_t* text, int key)
 {
     m_context->sendInputStringOnEnterPressing(text);
     SubCommonDefine::tagSoftKeyBoardKeyData data;
@@ -92,7 +92,7 @@ void TestSizeToolBoxKeyboard::type(const wchar_t* text, int key)
     }
 }
 
-void TestSizeToolBoxKeyboard::leave(Way way)
+void tst_sizetoolbox_keyboard::leave(Way way)
 {
     switch (way) {
     case Return:
@@ -128,7 +128,7 @@ void TestSizeToolBoxKeyboard::leave(Way way)
     }
 }
 
-void TestSizeToolBoxKeyboard::isPutAwayOnce_data()
+void tst_sizetoolbox_keyboard::isPutAwayOnce_data()
 {
     QTest::addColumn<Way>("way");
     const QMetaEnum ways = QMetaEnum::fromType<Way>();
@@ -136,7 +136,7 @@ void TestSizeToolBoxKeyboard::isPutAwayOnce_data()
         QTest::newRow(ways.key(i)) << Way(ways.value(i));
 }
 
-void TestSizeToolBoxKeyboard::isPutAwayOnce()
+void tst_sizetoolbox_keyboard::isPutAwayOnce()
 {
     QFETCH(Way, way);
     tapField();
@@ -162,7 +162,7 @@ void TestSizeToolBoxKeyboard::isPutAwayOnce()
 }
 
 // Its own key has closed it already.
-void TestSizeToolBoxKeyboard::isNotPutAwayTwice()
+void tst_sizetoolbox_keyboard::isNotPutAwayTwice()
 {
     tapField();
     SubCommonDefine::tagSoftKeyBoardKeyData data;
@@ -173,7 +173,7 @@ void TestSizeToolBoxKeyboard::isNotPutAwayTwice()
 }
 
 // Another field has taken the keyboard over while the size was still being typed.
-void TestSizeToolBoxKeyboard::isLeftToTheTextThatHasIt()
+void tst_sizetoolbox_keyboard::isLeftToTheTextThatHasIt()
 {
     tapField();
     KSInputContext::resetFocusWidget();
@@ -192,7 +192,7 @@ int main(int argc, char** argv)
     KSInputContext::install();
     QApplication application(argc, argv);
     application.setObjectName(QStringLiteral("Titler"));
-    TestSizeToolBoxKeyboard test;
+    tst_sizetoolbox_keyboard test;
     QTEST_SET_MAIN_SOURCE_PATH
     return QTest::qExec(&test, argc, argv);
 }

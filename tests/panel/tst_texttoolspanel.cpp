@@ -19,7 +19,7 @@
 #include <QLineEdit>
 #include <QRadioButton>
 
-class TestTextToolsPanel : public QObject
+class tst_texttoolspanel : public QObject
 {
     Q_OBJECT
 
@@ -69,7 +69,7 @@ private:
     std::unique_ptr<Panel> m_panel;
 };
 
-void TestTextToolsPanel::init()
+void tst_texttoolspanel::init()
 {
     m_environment->messages.posted.clear();
     QFile::remove(QString::fromStdWString(IPathManagerEx::getInstance()->getSystemSettingPath()) +
@@ -78,12 +78,12 @@ void TestTextToolsPanel::init()
     QVERIFY(QTest::qWaitForWindowActive(&m_panel->window));
 }
 
-void TestTextToolsPanel::cleanup()
+void tst_texttoolspanel::cleanup()
 {
     m_panel.reset();
 }
 
-void TestTextToolsPanel::withoutAStyleNothingHappens()
+void tst_texttoolspanel::withoutAStyleNothingHappens()
 {
     m_environment->newLogLines();
     TextToolsPanel* panel = m_panel->panel;
@@ -103,7 +103,7 @@ void TestTextToolsPanel::withoutAStyleNothingHappens()
     QVERIFY(m_environment->newLogLines().isEmpty());
 }
 
-void TestTextToolsPanel::changesByTap_data()
+void tst_texttoolspanel::changesByTap_data()
 {
     QTest::addColumn<QString>("button");
     QTest::addColumn<int>("id");
@@ -122,7 +122,7 @@ void TestTextToolsPanel::changesByTap_data()
     QTest::newRow("left") << "Icon_MoveLeft" << 11 << "Move Text Object 2 px to the left";
 }
 
-void TestTextToolsPanel::changesByTap()
+void tst_texttoolspanel::changesByTap()
 {
     QFETCH(QString, button);
     QFETCH(int, id);
@@ -138,7 +138,7 @@ void TestTextToolsPanel::changesByTap()
     QVERIFY(m_panel->sent.first().style == *m_panel->panel->workingStyle());
 }
 
-void TestTextToolsPanel::sizesGoToTheirCharacters()
+void tst_texttoolspanel::sizesGoToTheirCharacters()
 {
     m_panel->select(mixedText());
     m_panel->tap("Icon_SizeUp");
@@ -159,7 +159,7 @@ void TestTextToolsPanel::sizesGoToTheirCharacters()
     QCOMPARE(m_panel->sent.size(), sent);
 }
 
-void TestTextToolsPanel::shadowTable()
+void tst_texttoolspanel::shadowTable()
 {
     m_panel->select(plainText());
     const QList<QPoint> directions{{0, 0}, {4, 4}, {0, 4}, {-4, 4}};
@@ -174,7 +174,7 @@ void TestTextToolsPanel::shadowTable()
     }
 }
 
-void TestTextToolsPanel::moveChangesThePlace()
+void tst_texttoolspanel::moveChangesThePlace()
 {
     m_panel->select(plainText());
     m_environment->tap(m_panel->find<QRadioButton>("MoveRange1"));
@@ -189,7 +189,7 @@ void TestTextToolsPanel::moveChangesThePlace()
     QCOMPARE(m_panel->sent.last().style.getXValue(), 92.0f);
 }
 
-void TestTextToolsPanel::edgeKindsKeepTheRest()
+void tst_texttoolspanel::edgeKindsKeepTheRest()
 {
     TEdge edge;
     edge.setEdgeWidth(9);
@@ -209,7 +209,7 @@ void TestTextToolsPanel::edgeKindsKeepTheRest()
     }
 }
 
-void TestTextToolsPanel::edgeLog_data()
+void tst_texttoolspanel::edgeLog_data()
 {
     QTest::addColumn<int>("on");
     QTest::addColumn<int>("undoFlag");
@@ -225,7 +225,7 @@ void TestTextToolsPanel::edgeLog_data()
     QTest::newRow("unknown kind") << 1 << 1 << 9 << "";
 }
 
-void TestTextToolsPanel::edgeLog()
+void tst_texttoolspanel::edgeLog()
 {
     QFETCH(int, on);
     QFETCH(int, undoFlag);
@@ -242,7 +242,7 @@ void TestTextToolsPanel::edgeLog()
     QCOMPARE(m_panel->sent.last().undoFlag, undoFlag);
 }
 
-void TestTextToolsPanel::sliderLogsItsCommitOnce()
+void tst_texttoolspanel::sliderLogsItsCommitOnce()
 {
     TText text = plainText();
     for (TextStyle* item : text.textItems())
@@ -271,7 +271,7 @@ void TestTextToolsPanel::sliderLogsItsCommitOnce()
     QVERIFY(m_environment->newLogLines().isEmpty());
 }
 
-void TestTextToolsPanel::mutedChangesAreLoggedOnly()
+void tst_texttoolspanel::mutedChangesAreLoggedOnly()
 {
     m_panel->select(plainText());
     m_panel->panel->setSignalValue(false);
@@ -284,7 +284,7 @@ void TestTextToolsPanel::mutedChangesAreLoggedOnly()
     QCOMPARE(m_panel->sent.size(), 1);
 }
 
-void TestTextToolsPanel::badIndicesAreDropped()
+void tst_texttoolspanel::badIndicesAreDropped()
 {
     m_panel->select(plainText());
     for (const int index : {-1, 5, 1000}) {
@@ -294,7 +294,7 @@ void TestTextToolsPanel::badIndicesAreDropped()
     QVERIFY(m_panel->sent.isEmpty());
 }
 
-void TestTextToolsPanel::copyIsOnlyLent()
+void tst_texttoolspanel::copyIsOnlyLent()
 {
     m_panel->select(plainText());
     // A canvas that answers during the call and changes what it got.
@@ -311,7 +311,7 @@ void TestTextToolsPanel::copyIsOnlyLent()
     disconnect(m_panel->panel, &TextToolsPanel::textStyleChange, this, nullptr);
 }
 
-void TestTextToolsPanel::mixedSelectionShows()
+void tst_texttoolspanel::mixedSelectionShows()
 {
     m_panel->select(mixedText());
     QCOMPARE(box<FamilyToolBox>()->getFontFamily(), QString());
@@ -339,7 +339,7 @@ void TestTextToolsPanel::mixedSelectionShows()
     QCOMPARE(box<KerningToolBox>()->getKerning(), -1);
 }
 
-void TestTextToolsPanel::showingSendsNothing()
+void tst_texttoolspanel::showingSendsNothing()
 {
     for (int round = 0; round < 3; ++round) {
         TText first = mixedText();
@@ -355,7 +355,7 @@ void TestTextToolsPanel::showingSendsNothing()
     QVERIFY(m_environment->messages.posted.isEmpty());
 }
 
-void TestTextToolsPanel::mixedBoldTurnsAllOn()
+void tst_texttoolspanel::mixedBoldTurnsAllOn()
 {
     m_panel->select(mixedText());
     m_panel->tap("Icon_Bold");
@@ -368,7 +368,7 @@ void TestTextToolsPanel::mixedBoldTurnsAllOn()
              QStringLiteral("[Text Property Area] 200: Adjust Bold to without bold"));
 }
 
-void TestTextToolsPanel::recordWithoutCharactersIsIgnored()
+void tst_texttoolspanel::recordWithoutCharactersIsIgnored()
 {
     m_panel->select(mixedText());
     TText empty;
@@ -376,7 +376,7 @@ void TestTextToolsPanel::recordWithoutCharactersIsIgnored()
     QCOMPARE(m_panel->panel->workingStyle()->textItems().size(), size_t(3));
 }
 
-void TestTextToolsPanel::previewKeepsTheSlidersPlace()
+void tst_texttoolspanel::previewKeepsTheSlidersPlace()
 {
     TText text = plainText();
     for (TextStyle* item : text.textItems())
@@ -399,7 +399,7 @@ void TestTextToolsPanel::previewKeepsTheSlidersPlace()
     disconnect(m_panel->panel, &TextToolsPanel::textStyleChange, this, nullptr);
 }
 
-void TestTextToolsPanel::enableRules()
+void tst_texttoolspanel::enableRules()
 {
     const QList<ToolBox*> always{box<FamilyToolBox>(), box<TextColorToolBox>(), box<SizeToolBox>(),
                                  box<BoldToolBox>(),   box<ItalicToolBox>(),    box<EdgeToolBox>(),
@@ -428,7 +428,7 @@ void TestTextToolsPanel::enableRules()
     QVERIFY(!m_panel->panel->colorPaletteIsShown());
 }
 
-void TestTextToolsPanel::selectionModes()
+void tst_texttoolspanel::selectionModes()
 {
     m_panel->panel->changeFontPropertyBtnStatus(true);
     for (const bool shadowAlign : {true, false}) {
@@ -443,7 +443,7 @@ void TestTextToolsPanel::selectionModes()
     }
 }
 
-void TestTextToolsPanel::newTextTakesWhatIsShown()
+void tst_texttoolspanel::newTextTakesWhatIsShown()
 {
     TText got;
     connect(m_panel->panel, &TextToolsPanel::signalUpdateCurrentTextProperty, this,
@@ -474,7 +474,7 @@ void TestTextToolsPanel::newTextTakesWhatIsShown()
     disconnect(m_panel->panel, &TextToolsPanel::signalUpdateCurrentTextProperty, this, nullptr);
 }
 
-void TestTextToolsPanel::newTextWithoutAFamily()
+void tst_texttoolspanel::newTextWithoutAFamily()
 {
     std::string family;
     connect(m_panel->panel, &TextToolsPanel::signalUpdateCurrentTextProperty, this,
@@ -486,7 +486,7 @@ void TestTextToolsPanel::newTextWithoutAFamily()
     disconnect(m_panel->panel, &TextToolsPanel::signalUpdateCurrentTextProperty, this, nullptr);
 }
 
-void TestTextToolsPanel::styleIsRemembered()
+void tst_texttoolspanel::styleIsRemembered()
 {
     m_panel->select(plainText());
     m_panel->tap("Icon_Bold");
@@ -513,7 +513,7 @@ void TestTextToolsPanel::styleIsRemembered()
     QVERIFY(!box<BoldToolBox>()->isBoxEnabled());
 }
 
-void TestTextToolsPanel::movesAndPreviewsAreNotRemembered()
+void tst_texttoolspanel::movesAndPreviewsAreNotRemembered()
 {
     m_panel->select(mixedText());
     m_panel->tap("Icon_MoveUp");
@@ -526,7 +526,7 @@ void TestTextToolsPanel::movesAndPreviewsAreNotRemembered()
              QStringList("[TextToolsPanelController] 200: read xml file failed"));
 }
 
-void TestTextToolsPanel::brokenSettings()
+void tst_texttoolspanel::brokenSettings()
 {
     QFile file(QString::fromStdWString(IPathManagerEx::getInstance()->getSystemSettingPath()) +
                QString::fromLatin1(SettingManager::SETTING_FILENAME));
@@ -544,7 +544,7 @@ void TestTextToolsPanel::brokenSettings()
     QCOMPARE(m_panel->sent.last().style.textItems()[0]->getFontSize(), 66);
 }
 
-void TestTextToolsPanel::halfTypedSizeIsDropped_data()
+void tst_texttoolspanel::halfTypedSizeIsDropped_data()
 {
     QTest::addColumn<QString>("button");
     for (const char* name :
@@ -553,7 +553,7 @@ void TestTextToolsPanel::halfTypedSizeIsDropped_data()
         QTest::newRow(name) << QString::fromLatin1(name);
 }
 
-void TestTextToolsPanel::halfTypedSizeIsDropped()
+void tst_texttoolspanel::halfTypedSizeIsDropped()
 {
     QFETCH(QString, button);
     m_panel->select(mixedText());
@@ -571,7 +571,7 @@ void TestTextToolsPanel::halfTypedSizeIsDropped()
     }
 }
 
-void TestTextToolsPanel::languages()
+void tst_texttoolspanel::languages()
 {
     TextToolsPanel* panel = m_panel->panel;
     const QList<std::pair<int, const char*>> families{{7, "KST Japanese Pro"},
@@ -589,7 +589,7 @@ void TestTextToolsPanel::languages()
     QCOMPARE(panel->defaultFamily(), QStringLiteral("DFHeiW5-A"));
 }
 
-void TestTextToolsPanel::forwarders()
+void tst_texttoolspanel::forwarders()
 {
     TextToolsPanel* panel = m_panel->panel;
     QSignalSpy slider(panel, &TextToolsPanel::signalShowEdgeSlider);
@@ -626,5 +626,5 @@ void TestTextToolsPanel::forwarders()
     QVERIFY(m_panel->sent.isEmpty());
 }
 
-QTEST_MAIN(TestTextToolsPanel)
+QTEST_MAIN(tst_texttoolspanel)
 #include "tst_texttoolspanel.moc"

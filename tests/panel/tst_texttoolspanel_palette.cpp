@@ -5,7 +5,7 @@
 #include "panel/ColorPalette.h"
 #include "panel/TextColorToolBox.h"
 
-class TestTextToolsPanelPalette : public QObject
+class tst_texttoolspanel_palette : public QObject
 {
     Q_OBJECT
 
@@ -29,13 +29,13 @@ private:
     std::unique_ptr<Panel> m_panel;
 };
 
-void TestTextToolsPanelPalette::init()
+void tst_texttoolspanel_palette::init()
 {
     m_panel = std::make_unique<Panel>(*m_environment);
     QVERIFY(QTest::qWaitForWindowActive(&m_panel->window));
 }
 
-void TestTextToolsPanelPalette::textPaletteOk()
+void tst_texttoolspanel_palette::textPaletteOk()
 {
     m_panel->select(mixedText());
     m_panel->tap("TextColor");
@@ -56,7 +56,7 @@ void TestTextToolsPanelPalette::textPaletteOk()
     QVERIFY(!palette->isVisible());
 }
 
-void TestTextToolsPanelPalette::textPaletteCancelWithMixedColors()
+void tst_texttoolspanel_palette::textPaletteCancelWithMixedColors()
 {
     // As the canvas does: every change comes back.
     connect(m_panel->panel, &TextToolsPanel::textStyleChange, this, [this](TText* style, int, int) {
@@ -78,7 +78,7 @@ void TestTextToolsPanelPalette::textPaletteCancelWithMixedColors()
     disconnect(m_panel->panel, &TextToolsPanel::textStyleChange, this, nullptr);
 }
 
-void TestTextToolsPanelPalette::edgePaletteCancelWithMixedColors()
+void tst_texttoolspanel_palette::edgePaletteCancelWithMixedColors()
 {
     const TText before = mixedText();
     m_panel->select(before);
@@ -95,7 +95,7 @@ void TestTextToolsPanelPalette::edgePaletteCancelWithMixedColors()
     QCOMPARE(colorsOf(m_panel->sent.last().style), colorsOf(before)); // the text's colours stay
 }
 
-void TestTextToolsPanelPalette::otherSelectionCancelsThePalette()
+void tst_texttoolspanel_palette::otherSelectionCancelsThePalette()
 {
     m_panel->select(mixedText());
     m_panel->tap("TextColor");
@@ -113,7 +113,7 @@ void TestTextToolsPanelPalette::otherSelectionCancelsThePalette()
     QCOMPARE(m_panel->sent.size(), 2);
 }
 
-void TestTextToolsPanelPalette::otherBoxCancelsThePalette()
+void tst_texttoolspanel_palette::otherBoxCancelsThePalette()
 {
     m_panel->select(mixedText());
     m_panel->tap("TextColor");
@@ -130,7 +130,7 @@ void TestTextToolsPanelPalette::otherBoxCancelsThePalette()
     QCOMPARE(m_panel->panel->workingStyle()->textItems()[2]->isFontBold(), 1);
 }
 
-void TestTextToolsPanelPalette::tapOnTheSameColorKeepsThePalette()
+void tst_texttoolspanel_palette::tapOnTheSameColorKeepsThePalette()
 {
     m_panel->select(mixedText());
     m_panel->tap("TextColor");
@@ -145,7 +145,7 @@ void TestTextToolsPanelPalette::tapOnTheSameColorKeepsThePalette()
     QCOMPARE(colorsOf(m_panel->sent.last().style), colorsOf(mixedText()));
 }
 
-void TestTextToolsPanelPalette::otherPaletteCancelsTheFirst()
+void tst_texttoolspanel_palette::otherPaletteCancelsTheFirst()
 {
     m_panel->select(mixedText());
     m_panel->tap("TextColor");
@@ -160,7 +160,7 @@ void TestTextToolsPanelPalette::otherPaletteCancelsTheFirst()
     QCOMPARE(m_panel->sent.last().id, 7);
 }
 
-void TestTextToolsPanelPalette::keyboardClosesThePalette()
+void tst_texttoolspanel_palette::keyboardClosesThePalette()
 {
     m_panel->select(mixedText());
     m_panel->tap("TextColor");
@@ -173,7 +173,7 @@ void TestTextToolsPanelPalette::keyboardClosesThePalette()
     QCOMPARE(colorsOf(m_panel->sent.last().style), colorsOf(mixedText()));
 }
 
-void TestTextToolsPanelPalette::paletteStandsInTheWindow()
+void tst_texttoolspanel_palette::paletteStandsInTheWindow()
 {
     m_panel->select(plainText());
     m_panel->panel->titlerWindowRectSlot(QRect(1280, 0, 1920, 1080));
@@ -183,5 +183,5 @@ void TestTextToolsPanelPalette::paletteStandsInTheWindow()
     QCOMPARE(palette->pos(), QPoint(1920, 350));
 }
 
-QTEST_MAIN(TestTextToolsPanelPalette)
+QTEST_MAIN(tst_texttoolspanel_palette)
 #include "tst_texttoolspanel_palette.moc"

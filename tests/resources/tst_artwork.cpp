@@ -66,7 +66,7 @@ bool isDisabled(const QString& name)
 
 } // namespace
 
-class TestArtwork : public QObject
+class tst_artwork : public QObject
 {
     Q_OBJECT
 
@@ -98,13 +98,13 @@ private Q_SLOTS:
     void lightFallsFromAbove();
 };
 
-void TestArtwork::initTestCase()
+void tst_artwork::initTestCase()
 {
     Q_INIT_RESOURCE(TitlerToolResource);
     Q_INIT_RESOURCE(UILibrary);
 }
 
-void TestArtwork::measuresMeasure()
+void tst_artwork::measuresMeasure()
 {
     QVERIFY(qAbs(contrast(Qt::white, Qt::black) - 21) < 0.01);
     QVERIFY(qAbs(contrast(QColor(118, 118, 118), Qt::white) - 4.54) < 0.02);
@@ -118,7 +118,7 @@ void TestArtwork::measuresMeasure()
     QCOMPARE(largestStepDown(stepped, 0, 3), 5);
 }
 
-void TestArtwork::toolIconsAreLegible()
+void tst_artwork::toolIconsAreLegible()
 {
     const QString plate = QStringLiteral(":/ToolsBar_Buttons/Button_67");
     const QImage pressed = face(plate + QStringLiteral("_Pressed_"));
@@ -143,7 +143,7 @@ void TestArtwork::toolIconsAreLegible()
     }
 }
 
-void TestArtwork::panelIconsAreLegible()
+void tst_artwork::panelIconsAreLegible()
 {
     const QStringList icons = picturesIn(QStringLiteral(":/TextToolPanel_Buttons"), QStringLiteral("Icon_*"));
     QVERIFY(icons.size() >= 49);
@@ -166,7 +166,7 @@ void TestArtwork::panelIconsAreLegible()
     }
 }
 
-void TestArtwork::iconsShareOneSize()
+void tst_artwork::iconsShareOneSize()
 {
     const QStringList icons = picturesIn(QStringLiteral(":"), QStringLiteral("Icon_*")) +
                               picturesIn(QStringLiteral(":/TextToolPanel_Buttons"), QStringLiteral("Icon_*"));
@@ -196,7 +196,7 @@ void TestArtwork::iconsShareOneSize()
     }
 }
 
-void TestArtwork::labelsAreLegible_data()
+void tst_artwork::labelsAreLegible_data()
 {
     QTest::addColumn<QString>("picture"); // a face that labels lie on
     QTest::addColumn<QColor>("ink");
@@ -231,7 +231,7 @@ void TestArtwork::labelsAreLegible_data()
     row(":/Pane_Tab/Tab_Disabled_Center", Tokens::TEXT_DISABLED, DISABLED_CONTRAST);
 }
 
-void TestArtwork::labelsAreLegible()
+void tst_artwork::labelsAreLegible()
 {
     QFETCH(const QString, picture);
     QFETCH(const QColor, ink);
@@ -244,7 +244,7 @@ void TestArtwork::labelsAreLegible()
     QVERIFY2(found >= least, qPrintable(QString::number(found)));
 }
 
-void TestArtwork::marksAreLegible()
+void tst_artwork::marksAreLegible()
 {
     // The ring or box against the list, and the mark inside against its fill.
     for (const char* kind :
@@ -269,7 +269,7 @@ void TestArtwork::marksAreLegible()
     }
 }
 
-void TestArtwork::signsAreLegible()
+void tst_artwork::signsAreLegible()
 {
     for (const char* name :
          {":/Views/Parts_011_Rest", ":/Views/Parts_012_Rest", ":/Picker/Picker_Allow_Up_Rest",
@@ -300,7 +300,7 @@ void TestArtwork::signsAreLegible()
     }
 }
 
-void TestArtwork::buttonStatesDiffer_data()
+void tst_artwork::buttonStatesDiffer_data()
 {
     QTest::addColumn<QStringList>("faces");
     QStringList large;
@@ -322,7 +322,7 @@ void TestArtwork::buttonStatesDiffer_data()
                                         tab + QStringLiteral("Selected_")};
 }
 
-void TestArtwork::buttonStatesDiffer()
+void tst_artwork::buttonStatesDiffer()
 {
     QFETCH(const QStringList, faces);
     for (int one = 0; one < faces.size(); ++one) {
@@ -341,7 +341,7 @@ void TestArtwork::buttonStatesDiffer()
     }
 }
 
-void TestArtwork::markStatesDiffer_data()
+void tst_artwork::markStatesDiffer_data()
 {
     QTest::addColumn<QStringList>("names");
     for (const char* kind : {"RadioButton/Radiobutton", "KSRadioButton/Radiobutton", "CheckBox/Checkbox"}) {
@@ -378,7 +378,7 @@ void TestArtwork::markStatesDiffer_data()
         QStringLiteral(":/TextToolPanel_TextBox/TextBox_Edittable_Disable_Pulldown")};
 }
 
-void TestArtwork::markStatesDiffer()
+void tst_artwork::markStatesDiffer()
 {
     QFETCH(const QStringList, names);
     for (int one = 0; one < names.size(); ++one) {
@@ -394,7 +394,7 @@ void TestArtwork::markStatesDiffer()
     }
 }
 
-void TestArtwork::rowPiecesFit_data()
+void tst_artwork::rowPiecesFit_data()
 {
     QTest::addColumn<QString>("base");
     QTest::addColumn<QStringList>("names");
@@ -425,7 +425,7 @@ void TestArtwork::rowPiecesFit_data()
     row(QStringLiteral(":/Scrollbar/Scbar_handle_h_pressed_"), ACROSS_SMALL);
 }
 
-void TestArtwork::rowPiecesFit()
+void tst_artwork::rowPiecesFit()
 {
     QFETCH(const QString, base);
     QFETCH(const QStringList, names);
@@ -444,14 +444,14 @@ void TestArtwork::rowPiecesFit()
     }
 }
 
-void TestArtwork::columnPiecesFit_data()
+void tst_artwork::columnPiecesFit_data()
 {
     QTest::addColumn<QString>("base");
     QTest::newRow("rest") << QStringLiteral(":/Scrollbar/Scbar_handle_v_rest_");
     QTest::newRow("pressed") << QStringLiteral(":/Scrollbar/Scbar_handle_v_pressed_");
 }
 
-void TestArtwork::columnPiecesFit()
+void tst_artwork::columnPiecesFit()
 {
     QFETCH(const QString, base);
     const QSize first = QImage(base + DOWN.at(0)).size();
@@ -474,7 +474,7 @@ void TestArtwork::columnPiecesFit()
     }
 }
 
-void TestArtwork::framesFit_data()
+void tst_artwork::framesFit_data()
 {
     QTest::addColumn<QString>("prefix");
     for (const char* prefix : {":/PanelBG/Pane_1_", ":/PanelBG/Pane_2_", ":/PanelBG/Dialog_base_",
@@ -484,7 +484,7 @@ void TestArtwork::framesFit_data()
     }
 }
 
-void TestArtwork::framesFit()
+void tst_artwork::framesFit()
 {
     QFETCH(const QString, prefix);
     const QSize corner = QImage(prefix + QStringLiteral("Upper_Left")).size();
@@ -511,7 +511,7 @@ void TestArtwork::framesFit()
     }
 }
 
-void TestArtwork::tipsJoinTheirFrames_data()
+void tst_artwork::tipsJoinTheirFrames_data()
 {
     QTest::addColumn<QString>("tip");
     QTest::addColumn<QString>("row");
@@ -524,7 +524,7 @@ void TestArtwork::tipsJoinTheirFrames_data()
                                    << QStringLiteral(":/ToolTip/Balloon_Common_Bottom_Center") << true;
 }
 
-void TestArtwork::tipsJoinTheirFrames()
+void tst_artwork::tipsJoinTheirFrames()
 {
     QFETCH(const QString, tip);
     QFETCH(const QString, row);
@@ -549,7 +549,7 @@ void TestArtwork::tipsJoinTheirFrames()
     QVERIFY(ink.height() >= picture.height() - 1);
 }
 
-void TestArtwork::tabsJoinTheirPane()
+void tst_artwork::tabsJoinTheirPane()
 {
     const QImage paneTop(QStringLiteral(":/Pane_Tab/Pane_Upper_Center"));
     const QRgb paneFace = QImage(QStringLiteral(":/Pane_Tab/Pane_Middle_Center")).pixel(0, 0);
@@ -565,7 +565,7 @@ void TestArtwork::tabsJoinTheirPane()
     }
 }
 
-void TestArtwork::stretchedPicturesAreFlat_data()
+void tst_artwork::stretchedPicturesAreFlat_data()
 {
     QTest::addColumn<bool>("isAcross"); // the way it is stretched
     for (const char* name :
@@ -578,7 +578,7 @@ void TestArtwork::stretchedPicturesAreFlat_data()
     }
 }
 
-void TestArtwork::stretchedPicturesAreFlat()
+void tst_artwork::stretchedPicturesAreFlat()
 {
     QFETCH(const bool, isAcross);
     const QImage image(QString::fromLatin1(QTest::currentDataTag()));
@@ -588,7 +588,7 @@ void TestArtwork::stretchedPicturesAreFlat()
              0);
 }
 
-void TestArtwork::lightFallsFromAbove()
+void tst_artwork::lightFallsFromAbove()
 {
     for (const QString& state : {QStringLiteral("_Rest"), QStringLiteral("selected_Rest")}) {
         const QImage image = face(panelButton(state));
@@ -601,5 +601,5 @@ void TestArtwork::lightFallsFromAbove()
     QVERIFY(groove.pixelColor(0, 0).lightness() < groove.pixelColor(0, groove.height() - 1).lightness());
 }
 
-QTEST_MAIN(TestArtwork)
+QTEST_MAIN(tst_artwork)
 #include "tst_artwork.moc"

@@ -26,7 +26,7 @@ const std::string GOOD_XML = "<?xml version=\"1.0\" ?>\n<manifest><meta-bg /></m
 
 } // namespace
 
-class TestAtomicFile : public QObject
+class tst_atomicfile : public QObject
 {
     Q_OBJECT
 
@@ -336,5 +336,5 @@ private:
     std::unique_ptr<QTemporaryDir> mFolder;
 };
 
-QTEST_GUILESS_MAIN(TestAtomicFile)
+QTEST_GUILESS_MAIN(tst_atomicfile)
 #include "tst_atomicfile.moc"

@@ -12,7 +12,7 @@
 #include <QtTest/QTest>
 #include <sys/stat.h>
 
-class TestConfinedPath : public QObject
+class tst_confinedpath : public QObject
 {
     Q_OBJECT
 
@@ -174,5 +174,5 @@ private:
     QTemporaryDir mRoot;
 };
 
-QTEST_GUILESS_MAIN(TestConfinedPath)
+QTEST_GUILESS_MAIN(tst_confinedpath)
 #include "tst_confinedpath.moc"

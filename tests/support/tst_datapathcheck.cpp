@@ -8,7 +8,7 @@
 #include <QTemporaryDir>
 #include <QTest>
 
-class TestDataPathCheck : public QObject
+class tst_datapathcheck : public QObject
 {
     Q_OBJECT
 
@@ -34,13 +34,13 @@ private:
     QTemporaryDir mFolder{"/tmp/dpcXXXXXX"};
 };
 
-void TestDataPathCheck::init()
+void tst_datapathcheck::init()
 {
     qunsetenv("K2SYS_AC_ROOT");
     QVERIFY(mFolder.isValid());
 }
 
-void TestDataPathCheck::goodPaths()
+void tst_datapathcheck::goodPaths()
 {
     const QByteArray path = mFolder.path().toUtf8();
     QCOMPARE(problemOf(path), QString());
@@ -56,7 +56,7 @@ void TestDataPathCheck::goodPaths()
     QCOMPARE(problemOf(path), QString());
 }
 
-void TestDataPathCheck::longPaths_data()
+void tst_datapathcheck::longPaths_data()
 {
     QTest::addColumn<int>("length");
     for (const int length : {100, 127, 128, 4095, 4096, 100000}) {
@@ -64,7 +64,7 @@ void TestDataPathCheck::longPaths_data()
     }
 }
 
-void TestDataPathCheck::longPaths()
+void tst_datapathcheck::longPaths()
 {
     QFETCH(int, length);
     const QByteArray path = mFolder.path().toUtf8() + '/';
@@ -72,7 +72,7 @@ void TestDataPathCheck::longPaths()
     QVERIFY(QDir(path).entryList(QDir::AllEntries | QDir::NoDotAndDotDot).filter("xx").size() <= 1);
 }
 
-void TestDataPathCheck::relativePaths_data()
+void tst_datapathcheck::relativePaths_data()
 {
     QTest::addColumn<QByteArray>("path");
     for (const char* path : {"data", "./data", "../data", "~/data", "."}) {
@@ -80,7 +80,7 @@ void TestDataPathCheck::relativePaths_data()
     }
 }
 
-void TestDataPathCheck::relativePaths()
+void tst_datapathcheck::relativePaths()
 {
     QFETCH(QByteArray, path);
     const QString problem = problemOf(path);
@@ -88,7 +88,7 @@ void TestDataPathCheck::relativePaths()
     QVERIFY(problem.contains('"' + path + '"'));
 }
 
-void TestDataPathCheck::aFileInTheWay()
+void tst_datapathcheck::aFileInTheWay()
 {
     QFile file(mFolder.filePath("file"));
     QVERIFY(file.open(QIODevice::WriteOnly));
@@ -97,13 +97,13 @@ void TestDataPathCheck::aFileInTheWay()
     QVERIFY(problemOf(file.fileName().toUtf8()).contains("cannot be written"));
 }
 
-void TestDataPathCheck::noFolderCanBeMade()
+void tst_datapathcheck::noFolderCanBeMade()
 {
     const QString problem = problemOf("/proc/titler");
     QVERIFY2(problem.contains("cannot be written"), qPrintable(problem));
 }
 
-void TestDataPathCheck::noFileCanBeMade()
+void tst_datapathcheck::noFileCanBeMade()
 {
     if (geteuid() == 0) {
         QSKIP("root may write everywhere");
@@ -115,12 +115,12 @@ void TestDataPathCheck::noFileCanBeMade()
     QVERIFY2(problem.contains("Permission denied"), qPrintable(problem));
 }
 
-void TestDataPathCheck::oneLineWhateverThePathHolds()
+void tst_datapathcheck::oneLineWhateverThePathHolds()
 {
     const QString problem = problemOf("one\ntwo\x1b[31m");
     QVERIFY2(problem.contains("\"one?two?[31m\""), qPrintable(problem));
     QVERIFY(!problem.contains('\n'));
 }
 
-QTEST_GUILESS_MAIN(TestDataPathCheck)
+QTEST_GUILESS_MAIN(tst_datapathcheck)
 #include "tst_datapathcheck.moc"

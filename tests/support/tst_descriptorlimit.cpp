@@ -5,7 +5,7 @@
 
 #include <QTest>
 
-class TestDescriptorLimit : public QObject
+class tst_descriptorlimit : public QObject
 {
     Q_OBJECT
 
@@ -31,14 +31,14 @@ private:
     }
 };
 
-void TestDescriptorLimit::raisesTheSoftLimit()
+void tst_descriptorlimit::raisesTheSoftLimit()
 {
     setSoft(256);
     const rlimit limit = raised();
     QCOMPARE(limit.rlim_cur, std::min<rlim_t>(DescriptorLimit::WANTED, limit.rlim_max));
 }
 
-void TestDescriptorLimit::keepsAHigherOne()
+void tst_descriptorlimit::keepsAHigherOne()
 {
     rlimit limit{};
     getrlimit(RLIMIT_NOFILE, &limit);
@@ -50,12 +50,12 @@ void TestDescriptorLimit::keepsAHigherOne()
 }
 
 // The last one: a hard limit does not go up again.
-void TestDescriptorLimit::staysBelowTheHardLimit()
+void tst_descriptorlimit::staysBelowTheHardLimit()
 {
     const rlimit low{200, 300};
     QCOMPARE(setrlimit(RLIMIT_NOFILE, &low), 0);
     QCOMPARE(raised().rlim_cur, rlim_t(300));
 }
 
-QTEST_GUILESS_MAIN(TestDescriptorLimit)
+QTEST_GUILESS_MAIN(tst_descriptorlimit)
 #include "tst_descriptorlimit.moc"

@@ -9,7 +9,7 @@
 
 #include <clocale>
 
-class TestK2sys : public QObject
+class tst_k2sys : public QObject
 {
     Q_OBJECT
 
@@ -29,7 +29,7 @@ private Q_SLOTS:
     void textLeavesTheLocaleAlone();
 };
 
-void TestK2sys::init()
+void tst_k2sys::init()
 {
     for (const char* name : {"K2SYS_AC_ROOT", "K2SYS_AC_DATA", "K2SYS_AC_PREFIX", "K2SYS_LOG_DIR",
                              "K2SYS_PORT_OFFSET", "K2SYS_FS_REMAIN", "XDG_DATA_HOME", "TZ"}) {
@@ -37,7 +37,7 @@ void TestK2sys::init()
     }
 }
 
-void TestK2sys::root()
+void tst_k2sys::root()
 {
     char buffer[128];
     QCOMPARE(k2sys_getenv_ac_root(buffer, sizeof buffer), 2);
@@ -50,7 +50,7 @@ void TestK2sys::root()
     QCOMPARE(buffer, "/mnt/root");
 }
 
-void TestK2sys::data()
+void tst_k2sys::data()
 {
     char buffer[4096];
     qputenv("HOME", "/home/operator");
@@ -67,7 +67,7 @@ void TestK2sys::data()
     QCOMPARE(buffer, "relative"); // for the program to refuse
 }
 
-void TestK2sys::prefix()
+void tst_k2sys::prefix()
 {
     char buffer[4096];
     QVERIFY(k2sys_getenv_ac_prefix(buffer, sizeof buffer) > 0);
@@ -77,7 +77,7 @@ void TestK2sys::prefix()
     QCOMPARE(buffer, "/usr/local");
 }
 
-void TestK2sys::smallBuffers()
+void tst_k2sys::smallBuffers()
 {
     qputenv("K2SYS_AC_ROOT", "/12345");
     qputenv("K2SYS_AC_DATA", "/12345");
@@ -95,7 +95,7 @@ void TestK2sys::smallBuffers()
     }
 }
 
-void TestK2sys::logFolder()
+void tst_k2sys::logFolder()
 {
     char buffer[128];
     QVERIFY(k2sys_log_dir(buffer, sizeof buffer) > 0);
@@ -105,7 +105,7 @@ void TestK2sys::logFolder()
     QCOMPARE(buffer, "/tmp/logs");
 }
 
-void TestK2sys::portOffset_data()
+void tst_k2sys::portOffset_data()
 {
     QTest::addColumn<QByteArray>("value");
     QTest::addColumn<int>("offset");
@@ -119,7 +119,7 @@ void TestK2sys::portOffset_data()
     QTest::newRow("far too much") << QByteArray("99999999999999999999") << 0;
 }
 
-void TestK2sys::portOffset()
+void tst_k2sys::portOffset()
 {
     QFETCH(QByteArray, value);
     QFETCH(int, offset);
@@ -129,7 +129,7 @@ void TestK2sys::portOffset()
     QCOMPARE(k2sys_port_offset(), offset);
 }
 
-void TestK2sys::fileSystem()
+void tst_k2sys::fileSystem()
 {
     QTemporaryDir folder;
     const QByteArray path = folder.path().toUtf8();
@@ -145,7 +145,7 @@ void TestK2sys::fileSystem()
     QVERIFY(k2sys_fs_remain(path.constData()) != 0);
 }
 
-void TestK2sys::timeAndZone()
+void tst_k2sys::timeAndZone()
 {
     tm now{};
     QCOMPARE(k2sys_get_time(&now), 1);
@@ -160,7 +160,7 @@ void TestK2sys::timeAndZone()
     QCOMPARE(k2sys_get_current_timezone(buffer, 5), 0);
 }
 
-void TestK2sys::textBothWays()
+void tst_k2sys::textBothWays()
 {
     for (const char* utf8 : {"", "plain", "é", "速報 快讯", "속보", "e\xCC\x81", "\xF0\x9F\x98\x80"}) {
         const std::wstring wide = multiByteToWide(utf8);
@@ -170,7 +170,7 @@ void TestK2sys::textBothWays()
     QVERIFY(wideToMultiByte(std::wstring(L"a\0b", 3)) == "a");
 }
 
-void TestK2sys::textThatCannotBeExpressed()
+void tst_k2sys::textThatCannotBeExpressed()
 {
     QCOMPARE(wideToMultiByte(L"ab" + std::wstring(1, static_cast<wchar_t>(0xD800)) + L"c"),
              std::string("ab"));
@@ -180,7 +180,7 @@ void TestK2sys::textThatCannotBeExpressed()
     QVERIFY(multiByteToWide(nullptr, 3).empty());
 }
 
-void TestK2sys::textLeavesTheLocaleAlone()
+void tst_k2sys::textLeavesTheLocaleAlone()
 {
     std::setlocale(LC_ALL, "C");
     QCOMPARE(wideToMultiByte(L"é"), std::string("é"));
@@ -188,5 +188,5 @@ void TestK2sys::textLeavesTheLocaleAlone()
     QCOMPARE(QByteArray(std::setlocale(LC_ALL, nullptr)), QByteArray("C"));
 }
 
-QTEST_GUILESS_MAIN(TestK2sys)
+QTEST_GUILESS_MAIN(tst_k2sys)
 #include "tst_k2sys.moc"

@@ -35,7 +35,7 @@ extern "C" int fsync(int descriptor)
     return static_cast<int>(::syscall(SYS_fsync, descriptor));
 }
 
-class tst_RefusedWrites : public QObject
+class tst_refusedwrites : public QObject
 {
     Q_OBJECT
 
@@ -224,5 +224,5 @@ private:
     std::atomic<int> mCalls = 0;
 };
 
-QTEST_GUILESS_MAIN(tst_RefusedWrites)
+QTEST_GUILESS_MAIN(tst_refusedwrites)
 #include "tst_refusedwrites.moc"

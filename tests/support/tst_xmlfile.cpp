@@ -63,7 +63,7 @@ const std::string SAMPLE = "<?xml version=\"1.0\" encoding=\"utf-8\" ?>\n"
 
 } // namespace
 
-class TestXmlFile : public QObject
+class tst_xmlfile : public QObject
 {
     Q_OBJECT
 
@@ -308,5 +308,5 @@ private:
     QTemporaryDir mFolder;
 };
 
-QTEST_GUILESS_MAIN(TestXmlFile)
+QTEST_GUILESS_MAIN(tst_xmlfile)
 #include "tst_xmlfile.moc"

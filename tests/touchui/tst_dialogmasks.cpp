@@ -5,7 +5,7 @@
 #include <QWidget>
 #include <memory>
 
-class tst_DialogMasks : public QObject
+class tst_dialogmasks : public QObject
 {
     Q_OBJECT
 
@@ -24,7 +24,7 @@ private:
     std::unique_ptr<QWidget> mOwner;
 };
 
-void tst_DialogMasks::touchesReachTheOwnerWithoutMasks_data()
+void tst_dialogmasks::touchesReachTheOwnerWithoutMasks_data()
 {
     QTest::addColumn<QString>("steps"); // D and M show the masks, d and m hide them
     QTest::addColumn<bool>("takesTouches");
@@ -38,7 +38,7 @@ void tst_DialogMasks::touchesReachTheOwnerWithoutMasks_data()
     QTest::newRow("hidden before shown") << "dm" << true;
 }
 
-void tst_DialogMasks::touchesReachTheOwnerWithoutMasks()
+void tst_dialogmasks::touchesReachTheOwnerWithoutMasks()
 {
     QFETCH(QString, steps);
     DialogMasks both(mOwner.get());
@@ -51,7 +51,7 @@ void tst_DialogMasks::touchesReachTheOwnerWithoutMasks()
     QTEST(takesTouches(), "takesTouches");
 }
 
-void tst_DialogMasks::masksAreMadeAtFirstUse()
+void tst_dialogmasks::masksAreMadeAtFirstUse()
 {
     DialogMasks both(mOwner.get());
     both.showDialogMaskWidget(false);
@@ -69,7 +69,7 @@ void tst_DialogMasks::masksAreMadeAtFirstUse()
     QCOMPARE(masks().size(), 2);
 }
 
-void tst_DialogMasks::marginsStayFree()
+void tst_dialogmasks::marginsStayFree()
 {
     mOwner->resize(300, 200);
     DialogMasks both(mOwner.get(), QMargins(10, 6, 9, 12));
@@ -77,7 +77,7 @@ void tst_DialogMasks::marginsStayFree()
     QCOMPARE(masks().constFirst()->geometry(), QRect(10, 6, 281, 182));
 }
 
-void tst_DialogMasks::pressesEndWhereAskedFor()
+void tst_dialogmasks::pressesEndWhereAskedFor()
 {
     DialogMasks through(mOwner.get());
     through.showDialogMaskWidget(true);
@@ -87,5 +87,5 @@ void tst_DialogMasks::pressesEndWhereAskedFor()
     QVERIFY(masks().constLast()->testAttribute(Qt::WA_NoMousePropagation));
 }
 
-QTEST_MAIN(tst_DialogMasks)
+QTEST_MAIN(tst_dialogmasks)
 #include "tst_dialogmasks.moc"

@@ -4,7 +4,7 @@
 
 using SubCommonDefine::tagSoftKeyBoardInitData;
 
-class TestFieldName : public QObject
+class tst_fieldname : public QObject
 {
     Q_OBJECT
 private Q_SLOTS:
@@ -83,6 +83,6 @@ private Q_SLOTS:
     }
 };
 
-QTEST_APPLESS_MAIN(TestFieldName)
+QTEST_APPLESS_MAIN(tst_fieldname)
 
 #include "tst_fieldname.moc"

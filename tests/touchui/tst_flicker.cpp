@@ -37,7 +37,7 @@ public:
 
 } // namespace
 
-class TestFlicker : public QObject
+class tst_flicker : public QObject
 {
     Q_OBJECT
 private Q_SLOTS:
@@ -175,6 +175,6 @@ private:
     std::unique_ptr<ManualClock> mClock;
 };
 
-QTEST_MAIN(TestFlicker)
+QTEST_MAIN(tst_flicker)
 
 #include "tst_flicker.moc"

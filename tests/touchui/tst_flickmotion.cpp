@@ -29,7 +29,7 @@ Rules rulesOf(int kind)
 
 } // namespace
 
-class TestFlickMotion : public QObject
+class tst_flickmotion : public QObject
 {
     Q_OBJECT
 private Q_SLOTS:
@@ -62,7 +62,7 @@ private Q_SLOTS:
     void nonsense();
 };
 
-void TestFlickMotion::everyListTicksAlike()
+void tst_flickmotion::everyListTicksAlike()
 {
     for (int kind : {Viewer, Tree, Grid, Fonts}) {
         QCOMPARE(rulesOf(kind).interval, 33);
@@ -70,7 +70,7 @@ void TestFlickMotion::everyListTicksAlike()
     }
 }
 
-void TestFlickMotion::endOfFlick_data()
+void tst_flickmotion::endOfFlick_data()
 {
     QTest::addColumn<int>("kind");
     QTest::addColumn<qreal>("start");
@@ -89,7 +89,7 @@ void TestFlickMotion::endOfFlick_data()
     QTest::newRow("fonts: six") << int(Fonts) << 10.0 << 16.0 << false;
 }
 
-void TestFlickMotion::endOfFlick()
+void tst_flickmotion::endOfFlick()
 {
     QFETCH(int, kind);
     QFETCH(qreal, start);
@@ -97,7 +97,7 @@ void TestFlickMotion::endOfFlick()
     QTEST(isFlickEnd(rulesOf(kind), QPointF(0, start), QPointF(500, end)), "over");
 }
 
-void TestFlickMotion::dragTick_data()
+void tst_flickmotion::dragTick_data()
 {
     QTest::addColumn<int>("kind");
     QTest::addColumn<QPointF>("end"); // from (0, 0)
@@ -122,7 +122,7 @@ void TestFlickMotion::dragTick_data()
     QTest::newRow("fonts") << int(Fonts) << QPointF(0, 12) << QPointF(0, 6) << QPointF(0, 6) << 6;
 }
 
-void TestFlickMotion::dragTick()
+void tst_flickmotion::dragTick()
 {
     QFETCH(int, kind);
     QFETCH(QPointF, end);
@@ -133,7 +133,7 @@ void TestFlickMotion::dragTick()
     QVERIFY(!step.bounded);
 }
 
-void TestFlickMotion::flickTick_data()
+void tst_flickmotion::flickTick_data()
 {
     QTest::addColumn<int>("kind");
     QTest::addColumn<QPointF>("end"); // from (0, 0)
@@ -153,7 +153,7 @@ void TestFlickMotion::flickTick_data()
     QTest::newRow("fonts") << int(Fonts) << QPointF(0, 90) << QPointF(0, 3) << 45;
 }
 
-void TestFlickMotion::flickTick()
+void tst_flickmotion::flickTick()
 {
     QFETCH(int, kind);
     QFETCH(QPointF, end);
@@ -162,7 +162,7 @@ void TestFlickMotion::flickTick()
     QTEST(step.scroll, "scroll");
 }
 
-void TestFlickMotion::bounds_data()
+void tst_flickmotion::bounds_data()
 {
     QTest::addColumn<int>("distance");
     QTest::addColumn<int>("top");
@@ -180,7 +180,7 @@ void TestFlickMotion::bounds_data()
     QTest::newRow("item on the last row stays") << 1 << 400 << 499 << 0 << true;
 }
 
-void TestFlickMotion::bounds()
+void tst_flickmotion::bounds()
 {
     QFETCH(int, distance);
     QFETCH(int, top);
@@ -190,7 +190,7 @@ void TestFlickMotion::bounds()
     QTEST(bounded, "bounded");
 }
 
-void TestFlickMotion::boundedTickKeepsTheItemInside()
+void tst_flickmotion::boundedTickKeepsTheItemInside()
 {
     DragBounds item{100, 200, 500};
     QPointF start(0, 150);
@@ -206,7 +206,7 @@ void TestFlickMotion::boundedTickKeepsTheItemInside()
     QVERIFY(item.top <= 1);
 }
 
-void TestFlickMotion::dragCoversTheWay()
+void tst_flickmotion::dragCoversTheWay()
 {
     QPointF start(0, 0);
     const QPointF end(0, 200);
@@ -221,7 +221,7 @@ void TestFlickMotion::dragCoversTheWay()
     QVERIFY(moved >= 190 && moved <= 200);
 }
 
-void TestFlickMotion::flickGlidesAndRests()
+void tst_flickmotion::flickGlidesAndRests()
 {
     for (const qreal way : {6.0, 90.0, 600.0, -600.0}) {
         QPointF start(0, 0);
@@ -239,14 +239,14 @@ void TestFlickMotion::flickGlidesAndRests()
     }
 }
 
-void TestFlickMotion::treeCreepsOn()
+void tst_flickmotion::treeCreepsOn()
 {
     const Step step = dragStep(treeView(), QPointF(3, 50), QPointF(3, 50));
     QCOMPARE(step.scroll, 1);
     QCOMPARE(step.start, QPointF(3, 51));
 }
 
-void TestFlickMotion::scrolling_data()
+void tst_flickmotion::scrolling_data()
 {
     QTest::addColumn<int>("value");
     QTest::addColumn<int>("offset");
@@ -258,7 +258,7 @@ void TestFlickMotion::scrolling_data()
     QTest::newRow("huge") << 900 << std::numeric_limits<int>::min() << 1000;
 }
 
-void TestFlickMotion::scrolling()
+void tst_flickmotion::scrolling()
 {
     QFETCH(int, value);
     QFETCH(int, offset);
@@ -266,14 +266,14 @@ void TestFlickMotion::scrolling()
     QCOMPARE(scrolledValue(value, offset, 0, -20), 0);
 }
 
-void TestFlickMotion::limits()
+void tst_flickmotion::limits()
 {
     QVERIFY(isAtLimit(0, 0, 10));
     QVERIFY(isAtLimit(10, 0, 10));
     QVERIFY(!isAtLimit(9, 0, 10));
 }
 
-void TestFlickMotion::slop_data()
+void tst_flickmotion::slop_data()
 {
     QTest::addColumn<QPointF>("position"); // from (50, 50)
     QTest::addColumn<bool>("touch");
@@ -287,14 +287,14 @@ void TestFlickMotion::slop_data()
     QTest::newRow("10 and 11") << QPointF(40, 61) << true << true;
 }
 
-void TestFlickMotion::slop()
+void tst_flickmotion::slop()
 {
     QFETCH(QPointF, position);
     QTEST(isBeyondSlop(QPointF(50, 50), position, TOUCH_SLOP), "touch");
     QTEST(isBeyondSlop(QPointF(50, 50), position, MOUSE_SLOP), "mouse");
 }
 
-void TestFlickMotion::move_data()
+void tst_flickmotion::move_data()
 {
     QTest::addColumn<QPointF>("current");
     QTest::addColumn<bool>("moved");
@@ -304,13 +304,13 @@ void TestFlickMotion::move_data()
     QTest::newRow("15 and 14") << QPointF(15, 14) << true;
 }
 
-void TestFlickMotion::move()
+void tst_flickmotion::move()
 {
     QFETCH(QPointF, current);
     QTEST(isMove(QPointF(), current), "moved");
 }
 
-void TestFlickMotion::dropping_data()
+void tst_flickmotion::dropping_data()
 {
     QTest::addColumn<QList<int>>("tops");
     QTest::addColumn<int>("first");
@@ -332,7 +332,7 @@ void TestFlickMotion::dropping_data()
     QTest::newRow("none visible") << QList<int>() << 0 << 20 << 400 << 17 << 17;
 }
 
-void TestFlickMotion::dropping()
+void tst_flickmotion::dropping()
 {
     QFETCH(QList<int>, tops);
     QFETCH(int, first);
@@ -343,7 +343,7 @@ void TestFlickMotion::dropping()
     QTEST(dropIndex(candidates, first, count, lifted, old), "index");
 }
 
-void TestFlickMotion::edgeScrolling_data()
+void tst_flickmotion::edgeScrolling_data()
 {
     QTest::addColumn<int>("top");
     QTest::addColumn<int>("overhang");
@@ -361,7 +361,7 @@ void TestFlickMotion::edgeScrolling_data()
     QTest::newRow("taller than the list") << -12 << 40 << true << 10;
 }
 
-void TestFlickMotion::edgeScrolling()
+void tst_flickmotion::edgeScrolling()
 {
     QFETCH(int, top);
     QFETCH(int, overhang);
@@ -371,7 +371,7 @@ void TestFlickMotion::edgeScrolling()
         QTEST(edgeScrollOffset(top, overhang), "offset");
 }
 
-void TestFlickMotion::sliding_data()
+void tst_flickmotion::sliding_data()
 {
     QTest::addColumn<QPoint>("target");
     QTest::addColumn<QPoint>("result");
@@ -384,13 +384,13 @@ void TestFlickMotion::sliding_data()
     QTest::newRow("far corner stops") << QPoint(3000, 3000) << QPoint(7, 7);
 }
 
-void TestFlickMotion::sliding()
+void tst_flickmotion::sliding()
 {
     QFETCH(QPoint, target);
     QTEST(slideInside(target, QPoint(7, 7), QRect(0, 0, 1920, 1080), QSize(640, 333)), "result");
 }
 
-void TestFlickMotion::nonsense()
+void tst_flickmotion::nonsense()
 {
     const qreal infinity = std::numeric_limits<qreal>::infinity();
     const qreal nan = std::numeric_limits<qreal>::quiet_NaN();
@@ -403,5 +403,5 @@ void TestFlickMotion::nonsense()
     }
 }
 
-QTEST_GUILESS_MAIN(TestFlickMotion)
+QTEST_GUILESS_MAIN(tst_flickmotion)
 #include "tst_flickmotion.moc"

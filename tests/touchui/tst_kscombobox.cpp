@@ -16,7 +16,7 @@
 #include <QTest>
 #include <QtMath>
 
-class TestKSCombobox : public QObject
+class tst_kscombobox : public QObject
 {
     Q_OBJECT
 
@@ -76,7 +76,7 @@ private:
     KSCombobox* m_box = nullptr;
 };
 
-void TestKSCombobox::init()
+void tst_kscombobox::init()
 {
     Q_INIT_RESOURCE(UILibrary);
     Q_INIT_RESOURCE(TitlerToolResource);
@@ -93,14 +93,14 @@ void TestKSCombobox::init()
     QVERIFY(QTest::qWaitForWindowExposed(m_window.get()));
 }
 
-void TestKSCombobox::cleanup()
+void tst_kscombobox::cleanup()
 {
     m_window.reset();
     m_touch.reset();
     m_clock.reset();
 }
 
-void TestKSCombobox::tapOpensAndTapChooses()
+void tst_kscombobox::tapOpensAndTapChooses()
 {
     QSignalSpy popup(m_box, &KSCombobox::signalPopupShow);
     QSignalSpy shown(m_box, &KSCombobox::signalShowComboxList);
@@ -126,7 +126,7 @@ void TestKSCombobox::tapOpensAndTapChooses()
     QVERIFY(!m_touch->isLocked());
 }
 
-void TestKSCombobox::mouseOpensAndChooses()
+void tst_kscombobox::mouseOpensAndChooses()
 {
     QTest::mouseClick(m_box, Qt::LeftButton, {}, QPoint(30, 20));
     QVERIFY(m_box->isPopupVisible());
@@ -135,7 +135,7 @@ void TestKSCombobox::mouseOpensAndChooses()
     QCOMPARE(m_box->currentIndex(), 2);
 }
 
-void TestKSCombobox::listShowsOnlyWhenItCan()
+void tst_kscombobox::listShowsOnlyWhenItCan()
 {
     QSignalSpy popup(m_box, &KSCombobox::signalPopupShow);
     QSignalSpy shown(m_box, &KSCombobox::signalShowComboxList);
@@ -154,7 +154,7 @@ void TestKSCombobox::listShowsOnlyWhenItCan()
     QCOMPARE(shown.count(), 1);
 }
 
-void TestKSCombobox::event1001Closes()
+void tst_kscombobox::event1001Closes()
 {
     QSignalSpy shown(m_box, &KSCombobox::signalShowComboxList);
     open();
@@ -166,7 +166,7 @@ void TestKSCombobox::event1001Closes()
     QCOMPARE(shown.count(), 2);
 }
 
-void TestKSCombobox::processLockRemembersTheOpenList()
+void tst_kscombobox::processLockRemembersTheOpenList()
 {
     auto* process = new KSEventProcessLockObject(m_touch->filter.get());
     m_touch->filter->registerLockObject(m_touch->filter.get(), process, LOCKOBJECT_PROCESS, nullptr);
@@ -180,7 +180,7 @@ void TestKSCombobox::processLockRemembersTheOpenList()
     process->slotRestoreAll();
 }
 
-void TestKSCombobox::pressOutsideClosesAndPressesNothing()
+void tst_kscombobox::pressOutsideClosesAndPressesNothing()
 {
     QSignalSpy clicked(m_button, &QAbstractButton::clicked);
     QSignalSpy pressed(m_button, &QAbstractButton::pressed);
@@ -199,7 +199,7 @@ void TestKSCombobox::pressOutsideClosesAndPressesNothing()
     QVERIFY(!m_touch->isLocked());
 }
 
-void TestKSCombobox::disablingClosesTheList()
+void tst_kscombobox::disablingClosesTheList()
 {
     open();
     m_box->setDisabled(true);
@@ -214,7 +214,7 @@ void TestKSCombobox::disablingClosesTheList()
     QVERIFY(!m_box->isPopupVisible());
 }
 
-void TestKSCombobox::disabledRowKeepsTheListOpen()
+void tst_kscombobox::disabledRowKeepsTheListOpen()
 {
     qobject_cast<QStandardItemModel*>(m_box->model())->item(1)->setEnabled(false);
     QSignalSpy activated(m_box, &QComboBox::activated);
@@ -224,7 +224,7 @@ void TestKSCombobox::disabledRowKeepsTheListOpen()
     QCOMPARE(activated.count(), 0);
 }
 
-void TestKSCombobox::switchedRows()
+void tst_kscombobox::switchedRows()
 {
     m_box->setItemData(2, true, KSCombobox::USBRole);
     m_box->setUSBEnabled(false);
@@ -234,7 +234,7 @@ void TestKSCombobox::switchedRows()
     QVERIFY(m_box->model()->index(2, 0).flags() & Qt::ItemIsEnabled);
 }
 
-void TestKSCombobox::cancelAndSecondFinger()
+void tst_kscombobox::cancelAndSecondFinger()
 {
     QSignalSpy activated(m_box, &QComboBox::activated);
     open();
@@ -257,7 +257,7 @@ void TestKSCombobox::cancelAndSecondFinger()
     QVERIFY(m_box->isPopupVisible());
 }
 
-void TestKSCombobox::width_data()
+void tst_kscombobox::width_data()
 {
     QTest::addColumn<int>("box");
     QTest::addColumn<bool>("byText");
@@ -272,7 +272,7 @@ void TestKSCombobox::width_data()
     QTest::newRow("wide enough") << 500 << true << false << 500;
 }
 
-void TestKSCombobox::width()
+void tst_kscombobox::width()
 {
     QFETCH(int, box);
     QFETCH(bool, byText);
@@ -280,7 +280,7 @@ void TestKSCombobox::width()
     QTEST(KSCombobox::listWidth(box, 200, byText, bar), "expected");
 }
 
-void TestKSCombobox::longestRowIsWhole_data()
+void tst_kscombobox::longestRowIsWhole_data()
 {
     QTest::addColumn<QString>("row");
     // Widths in fractions of a pixel, some to be rounded up and some down.
@@ -290,7 +290,7 @@ void TestKSCombobox::longestRowIsWhole_data()
         QTest::newRow(row) << QString::fromLatin1(row);
 }
 
-void TestKSCombobox::longestRowIsWhole()
+void tst_kscombobox::longestRowIsWhole()
 {
     QFETCH(QString, row);
     m_box->setListWidthByText(true);
@@ -306,7 +306,7 @@ void TestKSCombobox::longestRowIsWhole()
 }
 
 // Without a compositor they would be black.
-void TestKSCombobox::cornersAreNotPartOfTheList()
+void tst_kscombobox::cornersAreNotPartOfTheList()
 {
     for (const int rows : {5, 3}) {
         fill(rows);
@@ -320,7 +320,7 @@ void TestKSCombobox::cornersAreNotPartOfTheList()
     }
 }
 
-void TestKSCombobox::placedUnderOrOverTheBox()
+void tst_kscombobox::placedUnderOrOverTheBox()
 {
     const QPoint corner = m_box->mapToGlobal(QPoint(0, 0));
     open();
@@ -345,7 +345,7 @@ void TestKSCombobox::placedUnderOrOverTheBox()
              qCeil(QFontMetricsF(m_box->font()).horizontalAdvance(m_box->itemText(5))) + 44);
 }
 
-void TestKSCombobox::listFollowsTheFingerAndRunsOn()
+void tst_kscombobox::listFollowsTheFingerAndRunsOn()
 {
     fill(60);
     open();
@@ -373,7 +373,7 @@ void TestKSCombobox::listFollowsTheFingerAndRunsOn()
     QCOMPARE(m_box->currentIndex(), 0);
 }
 
-void TestKSCombobox::flickIntoTheEndStops()
+void tst_kscombobox::flickIntoTheEndStops()
 {
     fill(14); // little more than what is shown
     open();
@@ -392,7 +392,7 @@ void TestKSCombobox::flickIntoTheEndStops()
     QCOMPARE(m_box->currentIndex(), 13);
 }
 
-void TestKSCombobox::brakeChoosesNothing()
+void tst_kscombobox::brakeChoosesNothing()
 {
     fill(90);
     open();
@@ -409,7 +409,7 @@ void TestKSCombobox::brakeChoosesNothing()
     QVERIFY(m_box->currentIndex() > 0);
 }
 
-void TestKSCombobox::smallMoveIsATapLargerIsNot()
+void tst_kscombobox::smallMoveIsATapLargerIsNot()
 {
     fill(60);
     open();
@@ -432,7 +432,7 @@ void TestKSCombobox::smallMoveIsATapLargerIsNot()
     QVERIFY(m_box->isPopupVisible());
 }
 
-void TestKSCombobox::mouseDragsTheList()
+void tst_kscombobox::mouseDragsTheList()
 {
     fill(60);
     open();
@@ -446,7 +446,7 @@ void TestKSCombobox::mouseDragsTheList()
     QCOMPARE(m_box->currentIndex(), 0);
 }
 
-void TestKSCombobox::keysOfTheList()
+void tst_kscombobox::keysOfTheList()
 {
     open();
     QWidget* popup = m_box->listView()->window();
@@ -462,7 +462,7 @@ void TestKSCombobox::keysOfTheList()
     QCOMPARE(m_box->currentIndex(), 1);
 }
 
-void TestKSCombobox::coloursAsRows()
+void tst_kscombobox::coloursAsRows()
 {
     m_box->clear();
     m_box->addItems({QStringLiteral("#C80000"), QStringLiteral("plain")});
@@ -476,7 +476,7 @@ void TestKSCombobox::coloursAsRows()
     QVERIFY(!CustomComboBoxDelegate::rowColor(QModelIndex()).isValid());
 }
 
-void TestKSCombobox::editableBoxTakesTheTap()
+void tst_kscombobox::editableBoxTakesTheTap()
 {
     m_box->setEditable(true);
     m_box->lineEdit()->setText(QStringLiteral("text"));
@@ -486,7 +486,7 @@ void TestKSCombobox::editableBoxTakesTheTap()
     QVERIFY(m_box->isPopupVisible());
 }
 
-void TestKSCombobox::looks()
+void tst_kscombobox::looks()
 {
     const QImage rest = m_box->grab().toImage();
     m_box->setEnabled(false);
@@ -499,5 +499,5 @@ void TestKSCombobox::looks()
     QVERIFY(m_box->grab().toImage() != rest);
 }
 
-QTEST_MAIN(TestKSCombobox)
+QTEST_MAIN(tst_kscombobox)
 #include "tst_kscombobox.moc"

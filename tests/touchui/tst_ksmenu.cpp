@@ -8,7 +8,7 @@
 #include <QTest>
 #include <QTimer>
 
-class TestKSMenu : public QObject
+class tst_ksmenu : public QObject
 {
     Q_OBJECT
 
@@ -52,7 +52,7 @@ private:
     QList<QAction*> m_actions;
 };
 
-void TestKSMenu::init()
+void tst_ksmenu::init()
 {
     Q_INIT_RESOURCE(UILibrary);
     m_touch = std::make_unique<TouchFixture>();
@@ -69,14 +69,14 @@ void TestKSMenu::init()
     m_actions[1]->setEnabled(false);
 }
 
-void TestKSMenu::cleanup()
+void tst_ksmenu::cleanup()
 {
     KSMenu::setMainWindow(nullptr);
     m_window.reset();
     m_touch.reset();
 }
 
-void TestKSMenu::tapChoosesAndCloses()
+void tst_ksmenu::tapChoosesAndCloses()
 {
     QSignalSpy triggered(m_menu, &QMenu::triggered);
     QSignalSpy closing(m_menu, &KSMenu::signalMenuAboutToClose);
@@ -92,7 +92,7 @@ void TestKSMenu::tapChoosesAndCloses()
     QCOMPARE(closing.count(), 1);
 }
 
-void TestKSMenu::mouseChoosesTheSameWay()
+void tst_ksmenu::mouseChoosesTheSameWay()
 {
     QSignalSpy triggered(m_menu, &QMenu::triggered);
     open();
@@ -105,7 +105,7 @@ void TestKSMenu::mouseChoosesTheSameWay()
     QCOMPARE(triggered.at(0).at(0).value<QAction*>(), m_actions[0]);
 }
 
-void TestKSMenu::disabledActionKeepsItOpen()
+void tst_ksmenu::disabledActionKeepsItOpen()
 {
     QSignalSpy triggered(m_menu, &QMenu::triggered);
     open();
@@ -117,7 +117,7 @@ void TestKSMenu::disabledActionKeepsItOpen()
     QCOMPARE(triggered.count(), 0);
 }
 
-void TestKSMenu::slidingOffChoosesNothing()
+void tst_ksmenu::slidingOffChoosesNothing()
 {
     QSignalSpy triggered(m_menu, &QMenu::triggered);
     open();
@@ -132,7 +132,7 @@ void TestKSMenu::slidingOffChoosesNothing()
     QVERIFY(!m_touch->isLocked());
 }
 
-void TestKSMenu::secondFingerChoosesNothing()
+void tst_ksmenu::secondFingerChoosesNothing()
 {
     QSignalSpy triggered(m_menu, &QMenu::triggered);
     open();
@@ -147,7 +147,7 @@ void TestKSMenu::secondFingerChoosesNothing()
     QCOMPARE(triggered.at(0).at(0).value<QAction*>(), m_actions[0]);
 }
 
-void TestKSMenu::cancelChoosesNothing()
+void tst_ksmenu::cancelChoosesNothing()
 {
     QSignalSpy triggered(m_menu, &QMenu::triggered);
     open();
@@ -160,7 +160,7 @@ void TestKSMenu::cancelChoosesNothing()
     QVERIFY(m_menu->isVisible());
 }
 
-void TestKSMenu::otherButtonsChooseNothing()
+void tst_ksmenu::otherButtonsChooseNothing()
 {
     QSignalSpy triggered(m_menu, &QMenu::triggered);
     open();
@@ -169,14 +169,14 @@ void TestKSMenu::otherButtonsChooseNothing()
     QCOMPARE(triggered.count(), 0);
 }
 
-void TestKSMenu::pressOutsideClosesAndPressesNothing_data()
+void tst_ksmenu::pressOutsideClosesAndPressesNothing_data()
 {
     QTest::addColumn<bool>("finger");
     QTest::newRow("finger") << true;
     QTest::newRow("mouse") << false;
 }
 
-void TestKSMenu::pressOutsideClosesAndPressesNothing()
+void tst_ksmenu::pressOutsideClosesAndPressesNothing()
 {
     QFETCH(bool, finger);
     const auto tapButton = [this, finger] {
@@ -203,7 +203,7 @@ void TestKSMenu::pressOutsideClosesAndPressesNothing()
 }
 
 // As the window does while the slider of the edge is open.
-void TestKSMenu::pressOutsideClosesItBeforeOthersTakeIt()
+void tst_ksmenu::pressOutsideClosesItBeforeOthersTakeIt()
 {
     class Eater : public QObject
     {
@@ -227,7 +227,7 @@ void TestKSMenu::pressOutsideClosesItBeforeOthersTakeIt()
 }
 
 // A touch that the locks refuse, here a second finger's, reaches nobody.
-void TestKSMenu::refusedFingerOutsideLeavesItOpen()
+void tst_ksmenu::refusedFingerOutsideLeavesItOpen()
 {
     QPushButton other(m_window.get());
     other.setAttribute(Qt::WA_AcceptTouchEvents);
@@ -248,7 +248,7 @@ void TestKSMenu::refusedFingerOutsideLeavesItOpen()
     QVERIFY(!m_touch->isLocked());
 }
 
-void TestKSMenu::fingerThatOpenedItIsLiftedForItsWidget()
+void tst_ksmenu::fingerThatOpenedItIsLiftedForItsWidget()
 {
     QSignalSpy clicked(m_button, &QAbstractButton::clicked);
     QSignalSpy triggered(m_menu, &QMenu::triggered);
@@ -261,7 +261,7 @@ void TestKSMenu::fingerThatOpenedItIsLiftedForItsWidget()
     QCOMPARE(triggered.count(), 0);
 }
 
-void TestKSMenu::closesByItsTimer()
+void tst_ksmenu::closesByItsTimer()
 {
     QSignalSpy closing(m_menu, &KSMenu::signalMenuAboutToClose);
     m_menu->setAutoCloseTime(30);
@@ -270,7 +270,7 @@ void TestKSMenu::closesByItsTimer()
     QCOMPARE(closing.count(), 1);
 }
 
-void TestKSMenu::noTimeNoTimer()
+void tst_ksmenu::noTimeNoTimer()
 {
     open();
     m_menu->startAutoCloseTimer();
@@ -286,7 +286,7 @@ void TestKSMenu::noTimeNoTimer()
     QVERIFY(!timers.constFirst()->isActive());
 }
 
-void TestKSMenu::closeTellsOnlyWhenVisible()
+void tst_ksmenu::closeTellsOnlyWhenVisible()
 {
     QSignalSpy closing(m_menu, &KSMenu::signalMenuAboutToClose);
     m_menu->close();
@@ -296,7 +296,7 @@ void TestKSMenu::closeTellsOnlyWhenVisible()
     QCOMPARE(closing.count(), 1);
 }
 
-void TestKSMenu::keys()
+void tst_ksmenu::keys()
 {
     QSignalSpy triggered(m_menu, &QMenu::triggered);
     open();
@@ -313,7 +313,7 @@ void TestKSMenu::keys()
     QCOMPARE(triggered.count(), 1);
 }
 
-void TestKSMenu::placedBesideTheAnchor()
+void tst_ksmenu::placedBesideTheAnchor()
 {
     const QPoint anchor(300, 260);
     m_menu->setBalloonAlignment(MenuPlacement::Below);
@@ -337,7 +337,7 @@ void TestKSMenu::placedBesideTheAnchor()
     QCOMPARE(m_menu->geometry().right() + 1, m_window->mapToGlobal(QPoint(800, 0)).x());
 }
 
-void TestKSMenu::backgroundAndRows()
+void tst_ksmenu::backgroundAndRows()
 {
     open();
     QCOMPARE(m_menu->getMenuBackgroundRect(), m_menu->rect().adjusted(0, 12, 0, 0));
@@ -353,7 +353,7 @@ void TestKSMenu::backgroundAndRows()
     QCOMPARE(m_menu->getMenuBackgroundRect(), m_menu->rect().adjusted(12, 0, 0, 0));
 }
 
-void TestKSMenu::hiddenActionsHaveNoRow()
+void tst_ksmenu::hiddenActionsHaveNoRow()
 {
     m_actions[0]->setVisible(false);
     m_menu->addSeparator();
@@ -364,7 +364,7 @@ void TestKSMenu::hiddenActionsHaveNoRow()
     QCOMPARE(triggered.at(0).at(0).value<QAction*>(), m_actions[2]);
 }
 
-void TestKSMenu::pressedRowIsMarked()
+void tst_ksmenu::pressedRowIsMarked()
 {
     open();
     const QImage rest = m_menu->grab().toImage();
@@ -377,7 +377,7 @@ void TestKSMenu::pressedRowIsMarked()
     m_touch->lift(m_menu, row(1));
 }
 
-void TestKSMenu::emptyMenu()
+void tst_ksmenu::emptyMenu()
 {
     KSMenu menu(m_window.get());
     menu.popup(m_window->mapToGlobal(QPoint(100, 100)));
@@ -389,5 +389,5 @@ void TestKSMenu::emptyMenu()
     }
 }
 
-QTEST_MAIN(TestKSMenu)
+QTEST_MAIN(tst_ksmenu)
 #include "tst_ksmenu.moc"

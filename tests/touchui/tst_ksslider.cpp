@@ -7,7 +7,7 @@
 #include <QSignalSpy>
 #include <QTest>
 
-class TestKSSLider : public QObject
+class tst_ksslider : public QObject
 {
     Q_OBJECT
 
@@ -56,7 +56,7 @@ const QString IMAGES =
 
 } // namespace
 
-void TestKSSLider::init()
+void tst_ksslider::init()
 {
     Q_INIT_RESOURCE(UILibrary);
     m_touch = std::make_unique<TouchFixture>();
@@ -70,14 +70,14 @@ void TestKSSLider::init()
     QVERIFY(QTest::qWaitForWindowExposed(m_window.get()));
 }
 
-void TestKSSLider::cleanup()
+void tst_ksslider::cleanup()
 {
     m_window.reset();
     KSToolTip::clearInstance();
     m_touch.reset();
 }
 
-void TestKSSLider::dragFollowsTheFinger()
+void tst_ksslider::dragFollowsTheFinger()
 {
     QSignalSpy pressed(m_slider, &KSSLider::signalMousePressed);
     QSignalSpy released(m_slider, &KSSLider::signalMouseRelease);
@@ -97,7 +97,7 @@ void TestKSSLider::dragFollowsTheFinger()
     QCOMPARE(moved.count(), 2);
 }
 
-void TestKSSLider::pressOffTheCentreKeepsItsOffset_data()
+void tst_ksslider::pressOffTheCentreKeepsItsOffset_data()
 {
     QTest::addColumn<double>("halves"); // of the handle's width
     QTest::newRow("left half") << -0.7;
@@ -105,7 +105,7 @@ void TestKSSLider::pressOffTheCentreKeepsItsOffset_data()
     QTest::newRow("just beside the picture") << 1.2;
 }
 
-void TestKSSLider::pressOffTheCentreKeepsItsOffset()
+void tst_ksslider::pressOffTheCentreKeepsItsOffset()
 {
     QFETCH(double, halves);
     const QPoint offset(qRound(halves * m_slider->handleRect().width() / 2), 3);
@@ -122,7 +122,7 @@ void TestKSSLider::pressOffTheCentreKeepsItsOffset()
     QCOMPARE(m_slider->value(), 7);
 }
 
-void TestKSSLider::mouseDragsTheSameWay()
+void tst_ksslider::mouseDragsTheSameWay()
 {
     QTest::mousePress(m_slider, Qt::LeftButton, {}, center() + QPoint(10, 0));
     QVERIFY(m_slider->isSliderDown());
@@ -133,7 +133,7 @@ void TestKSSLider::mouseDragsTheSameWay()
     QCOMPARE(m_slider->value(), 3);
 }
 
-void TestKSSLider::touchOfAnotherFingerIsDropped()
+void tst_ksslider::touchOfAnotherFingerIsDropped()
 {
     m_touch->press(m_slider, center(), 3);
     // Straight to the slider: a point that it does not know.
@@ -149,7 +149,7 @@ void TestKSSLider::touchOfAnotherFingerIsDropped()
     QVERIFY(!m_slider->isSliderDown());
 }
 
-void TestKSSLider::secondFingerDoesNotMoveIt()
+void tst_ksslider::secondFingerDoesNotMoveIt()
 {
     auto touch = QTest::touchEvent(m_slider, m_touch->device(), false);
     touch.press(0, center(), m_slider).commit();
@@ -164,7 +164,7 @@ void TestKSSLider::secondFingerDoesNotMoveIt()
     QVERIFY(!m_touch->isLocked());
 }
 
-void TestKSSLider::cancelLetsGo()
+void tst_ksslider::cancelLetsGo()
 {
     QSignalSpy released(m_slider, &KSSLider::signalMouseRelease);
     m_touch->press(m_slider, center());
@@ -182,7 +182,7 @@ void TestKSSLider::cancelLetsGo()
     m_touch->lift(m_slider, center());
 }
 
-void TestKSSLider::pressBesideTheHandlePages()
+void tst_ksslider::pressBesideTheHandlePages()
 {
     m_slider->setValue(2);
     m_touch->press(m_slider, centerAt(9));
@@ -195,7 +195,7 @@ void TestKSSLider::pressBesideTheHandlePages()
     QCOMPARE(m_slider->value(), 2);
 }
 
-void TestKSSLider::otherMouseButtonsDoNothing()
+void tst_ksslider::otherMouseButtonsDoNothing()
 {
     QSignalSpy pressed(m_slider, &KSSLider::signalMousePressed);
     QTest::mousePress(m_slider, Qt::RightButton, {}, center());
@@ -210,7 +210,7 @@ void TestKSSLider::otherMouseButtonsDoNothing()
     QVERIFY(!m_slider->isSliderDown());
 }
 
-void TestKSSLider::keysAreSwallowed()
+void tst_ksslider::keysAreSwallowed()
 {
     for (const int key : {Qt::Key_Right, Qt::Key_PageUp, Qt::Key_End, Qt::Key_A}) {
         QTest::keyClick(m_slider, static_cast<Qt::Key>(key));
@@ -218,7 +218,7 @@ void TestKSSLider::keysAreSwallowed()
     QCOMPARE(m_slider->value(), 0);
 }
 
-void TestKSSLider::withoutResponseNothingMoves()
+void tst_ksslider::withoutResponseNothingMoves()
 {
     m_slider->setReponse(false);
     m_touch->press(m_slider, center());
@@ -236,7 +236,7 @@ void TestKSSLider::withoutResponseNothingMoves()
     m_touch->lift(m_slider, centerAt(8));
 }
 
-void TestKSSLider::disabledWhileHeldLetsGo()
+void tst_ksslider::disabledWhileHeldLetsGo()
 {
     m_touch->press(m_slider, center());
     m_slider->setEnabled(false);
@@ -251,7 +251,7 @@ void TestKSSLider::disabledWhileHeldLetsGo()
     m_touch->lift(m_slider, centerAt(5));
 }
 
-void TestKSSLider::hiddenWhileHeldLetsGo()
+void tst_ksslider::hiddenWhileHeldLetsGo()
 {
     QSignalSpy released(m_slider, &KSSLider::signalMouseRelease);
     QTest::mousePress(m_slider, Qt::LeftButton, {}, center());
@@ -263,7 +263,7 @@ void TestKSSLider::hiddenWhileHeldLetsGo()
     QTest::mouseRelease(m_window.get(), Qt::LeftButton);
 }
 
-void TestKSSLider::balloonTellsTheValue()
+void tst_ksslider::balloonTellsTheValue()
 {
     QSignalSpy text(m_slider, &KSSLider::signalDrawTipText);
     m_touch->press(m_slider, center());
@@ -277,7 +277,7 @@ void TestKSSLider::balloonTellsTheValue()
     QCOMPARE(text.at(1).at(0).toString(), QStringLiteral("4"));
 }
 
-void TestKSSLider::receiverWritesTheBalloon()
+void tst_ksslider::receiverWritesTheBalloon()
 {
     connect(m_slider, &KSSLider::signalDrawTip, this,
             [](KSSLider* slider) { slider->DrawTipText(QStringLiteral("%1 px").arg(slider->value())); });
@@ -286,14 +286,14 @@ void TestKSSLider::receiverWritesTheBalloon()
     m_touch->lift(m_slider, center());
 }
 
-void TestKSSLider::marks_data()
+void tst_ksslider::marks_data()
 {
     QTest::addColumn<int>("position");
     QTest::newRow("below") << int(QSlider::TicksBelow);
     QTest::newRow("above") << int(QSlider::TicksAbove);
 }
 
-void TestKSSLider::marks()
+void tst_ksslider::marks()
 {
     QFETCH(int, position);
     QVERIFY(m_slider->getTickRect(3).isNull());
@@ -315,7 +315,7 @@ void TestKSSLider::marks()
     QVERIFY(m_slider->getTickRect(3).isNull());
 }
 
-void TestKSSLider::picturesByState()
+void tst_ksslider::picturesByState()
 {
     const QImage rest = m_slider->grab().toImage();
     m_touch->press(m_slider, center());
@@ -335,7 +335,7 @@ void TestKSSLider::picturesByState()
             plain.grab().toImage().pixelColor(299, 2));
 }
 
-void TestKSSLider::upright()
+void tst_ksslider::upright()
 {
     KSSLider slider(QString(), Qt::Vertical, m_window.get());
     slider.setRange(0, 10);
@@ -348,5 +348,5 @@ void TestKSSLider::upright()
     QVERIFY(slider.handleRect().top() < 3);
 }
 
-QTEST_MAIN(TestKSSLider)
+QTEST_MAIN(tst_ksslider)
 #include "tst_ksslider.moc"

@@ -5,7 +5,7 @@
 
 using namespace MenuPlacement;
 
-class TestMenuPlacement : public QObject
+class tst_menuplacement : public QObject
 {
     Q_OBJECT
 
@@ -29,7 +29,7 @@ const QRect SCREEN(0, 0, 1920, 1080);
 
 } // namespace
 
-void TestMenuPlacement::top_data()
+void tst_menuplacement::top_data()
 {
     QTest::addColumn<int>("flags");
     QTest::addColumn<int>("anchor");
@@ -51,7 +51,7 @@ void TestMenuPlacement::top_data()
     QTest::newRow("higher than the bounds") << int(Below) << 50 << QRect(0, 40, 100, 200) << 40;
 }
 
-void TestMenuPlacement::top()
+void tst_menuplacement::top()
 {
     QFETCH(int, flags);
     QFETCH(int, anchor);
@@ -59,7 +59,7 @@ void TestMenuPlacement::top()
     QTEST(menuTop(flags, anchor, 300, bounds), "expected");
 }
 
-void TestMenuPlacement::left_data()
+void tst_menuplacement::left_data()
 {
     QTest::addColumn<int>("flags");
     QTest::addColumn<int>("anchor");
@@ -74,14 +74,14 @@ void TestMenuPlacement::left_data()
     QTest::newRow("beside, left") << int(Above) << 1721 << 1521;
 }
 
-void TestMenuPlacement::left()
+void tst_menuplacement::left()
 {
     QFETCH(int, flags);
     QFETCH(int, anchor);
     QTEST(menuLeft(flags, anchor, 200, SCREEN), "expected");
 }
 
-void TestMenuPlacement::arrow_data()
+void tst_menuplacement::arrow_data()
 {
     QTest::addColumn<int>("flags");
     QTest::addColumn<QPoint>("anchor");
@@ -97,7 +97,7 @@ void TestMenuPlacement::arrow_data()
                                    << QPoint(ARROW_INSET + ARROW_WIDTH / 2, 100);
 }
 
-void TestMenuPlacement::arrow()
+void tst_menuplacement::arrow()
 {
     QFETCH(int, flags);
     QFETCH(QPoint, anchor);
@@ -107,7 +107,7 @@ void TestMenuPlacement::arrow()
     QVERIFY(SCREEN.contains(placement.rect));
 }
 
-void TestMenuPlacement::balloon_data()
+void tst_menuplacement::balloon_data()
 {
     QTest::addColumn<QRect>("anchor");
     QTest::addColumn<bool>("below");
@@ -125,7 +125,7 @@ void TestMenuPlacement::balloon_data()
     QTest::newRow("no room at all") << QRect(0, 0, 1920, 1080) << false << QRect(910, 0, 100, 60) << down;
 }
 
-void TestMenuPlacement::balloon()
+void tst_menuplacement::balloon()
 {
     QFETCH(QRect, anchor);
     QFETCH(bool, below);
@@ -135,7 +135,7 @@ void TestMenuPlacement::balloon()
     QVERIFY(QRect(QPoint(), placement.rect.size()).contains(placement.tip));
 }
 
-void TestMenuPlacement::backgroundLeavesRoomForTheArrow()
+void tst_menuplacement::backgroundLeavesRoomForTheArrow()
 {
     const QSize size(100, 80);
     QCOMPARE(background(size, ArrowSide::Top), QRect(0, 12, 100, 68));
@@ -144,7 +144,7 @@ void TestMenuPlacement::backgroundLeavesRoomForTheArrow()
     QCOMPARE(background(size, ArrowSide::Right), QRect(0, 0, 88, 80));
 }
 
-void TestMenuPlacement::rows()
+void tst_menuplacement::rows()
 {
     const QRect area(0, 12, 100, 79); // 63 without the border, which three do not divide by 2
     QCOMPARE(rowRect(area, 8, 3, 0), QRect(8, 20, 84, 21));
@@ -160,5 +160,5 @@ void TestMenuPlacement::rows()
     QCOMPARE(rowAt(area, 8, 0, QPoint(50, 50)), -1);
 }
 
-QTEST_MAIN(TestMenuPlacement)
+QTEST_MAIN(tst_menuplacement)
 #include "tst_menuplacement.moc"

@@ -17,7 +17,7 @@ bool isSame(QRgb a, QRgb b)
 
 } // namespace
 
-class TestNineSlice : public QObject
+class tst_nineslice : public QObject
 {
     Q_OBJECT
 
@@ -33,7 +33,7 @@ private Q_SLOTS:
     void libraryFramesHaveNoSeams();
 };
 
-void TestNineSlice::cells_data()
+void tst_nineslice::cells_data()
 {
     QTest::addColumn<QRect>("target");
     QTest::addColumn<QMargins>("corners");
@@ -55,7 +55,7 @@ void TestNineSlice::cells_data()
                               << QRect(3, 4, 0, 0);
 }
 
-void TestNineSlice::cells()
+void tst_nineslice::cells()
 {
     QFETCH(QRect, target);
     QFETCH(QMargins, corners);
@@ -65,7 +65,7 @@ void TestNineSlice::cells()
     QTEST(cells[NineSlice::BottomRight], "bottomRight");
 }
 
-void TestNineSlice::cellsTile_data()
+void tst_nineslice::cellsTile_data()
 {
     QTest::addColumn<QSize>("size");
     for (const QSize& size :
@@ -74,7 +74,7 @@ void TestNineSlice::cellsTile_data()
     }
 }
 
-void TestNineSlice::cellsTile()
+void tst_nineslice::cellsTile()
 {
     QFETCH(QSize, size);
     const QRect target(QPoint(-3, 11), size);
@@ -88,7 +88,7 @@ void TestNineSlice::cellsTile()
     QCOMPARE(area, qint64(size.width()) * size.height()); // so none overlaps another
 }
 
-void TestNineSlice::rowAndColumn()
+void tst_nineslice::rowAndColumn()
 {
     const NineSlice::Triple row = NineSlice::row(QRect(2, 3, 50, 20), 10, 15);
     QCOMPARE(row[0], QRect(2, 3, 10, 20));
@@ -104,7 +104,7 @@ void TestNineSlice::rowAndColumn()
     QCOMPARE(narrow[2], QRect(2, 0, 8, 5));
 }
 
-void TestNineSlice::framePaintsEveryPixelAtEverySize()
+void tst_nineslice::framePaintsEveryPixelAtEverySize()
 {
     QTemporaryDir folder;
     QStringList paths;
@@ -132,7 +132,7 @@ void TestNineSlice::framePaintsEveryPixelAtEverySize()
     }
 }
 
-void TestNineSlice::missingPiecesStayUndrawn()
+void tst_nineslice::missingPiecesStayUndrawn()
 {
     QVERIFY(SliceFrame().isNull());
     QVERIFY(SliceFrame(QStringList{QStringLiteral("one")}).isNull());
@@ -146,7 +146,7 @@ void TestNineSlice::missingPiecesStayUndrawn()
     QCOMPARE(image.pixelColor(15, 15).alpha(), 0);
 }
 
-void TestNineSlice::libraryFramesHaveNoSeams_data()
+void tst_nineslice::libraryFramesHaveNoSeams_data()
 {
     QTest::addColumn<QString>("prefix");
     QTest::newRow("menu") << ":/Dialog/dialog_base_";
@@ -157,7 +157,7 @@ void TestNineSlice::libraryFramesHaveNoSeams_data()
 
 // Along a line that crosses the joints between corner and middle, the colour does not jump: the middle goes
 // on with the corner's last colour. Smoothing may round by a level.
-void TestNineSlice::libraryFramesHaveNoSeams()
+void tst_nineslice::libraryFramesHaveNoSeams()
 {
     Q_INIT_RESOURCE(UILibrary);
     QFETCH(QString, prefix);
@@ -184,5 +184,5 @@ void TestNineSlice::libraryFramesHaveNoSeams()
     }
 }
 
-QTEST_MAIN(TestNineSlice)
+QTEST_MAIN(tst_nineslice)
 #include "tst_nineslice.moc"

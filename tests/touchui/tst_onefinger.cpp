@@ -53,7 +53,7 @@ private:
 
 } // namespace
 
-class TestOneFinger : public QObject
+class tst_onefinger : public QObject
 {
     Q_OBJECT
 
@@ -270,5 +270,5 @@ private:
     std::unique_ptr<QSignalSpy> mCancelled;
 };
 
-QTEST_MAIN(TestOneFinger)
+QTEST_MAIN(tst_onefinger)
 #include "tst_onefinger.moc"

@@ -6,7 +6,7 @@
 #include <QWindow>
 #include <memory>
 
-class tst_WindowPlaceKeeper : public QObject
+class tst_windowplacekeeper : public QObject
 {
     Q_OBJECT
 
@@ -24,7 +24,7 @@ private:
     std::unique_ptr<QDialog> mDialog;
 };
 
-void tst_WindowPlaceKeeper::init()
+void tst_windowplacekeeper::init()
 {
     mDialog = std::make_unique<QDialog>(nullptr, Qt::Dialog | Qt::FramelessWindowHint);
     mDialog->setFixedSize(200, 100);
@@ -35,12 +35,12 @@ void tst_WindowPlaceKeeper::init()
     QCOMPARE(mDialog->windowHandle()->position(), QPoint(60, 40));
 }
 
-void tst_WindowPlaceKeeper::cleanup()
+void tst_windowplacekeeper::cleanup()
 {
     mDialog.reset();
 }
 
-void tst_WindowPlaceKeeper::takesTheWindowBack()
+void tst_windowplacekeeper::takesTheWindowBack()
 {
     carryTo({0, 0});
     QTRY_COMPARE(mDialog->windowHandle()->position(), QPoint(60, 40));
@@ -52,7 +52,7 @@ void tst_WindowPlaceKeeper::takesTheWindowBack()
     QTRY_COMPARE(mDialog->windowHandle()->position(), QPoint(60, 40));
 }
 
-void tst_WindowPlaceKeeper::followsTheProgram()
+void tst_windowplacekeeper::followsTheProgram()
 {
     mDialog->move(100, 80);
     QTRY_COMPARE(mDialog->windowHandle()->position(), QPoint(100, 80));
@@ -60,7 +60,7 @@ void tst_WindowPlaceKeeper::followsTheProgram()
     QTRY_COMPARE(mDialog->pos(), QPoint(100, 80));
 }
 
-void tst_WindowPlaceKeeper::doesNotQuarrel()
+void tst_windowplacekeeper::doesNotQuarrel()
 {
     // A window manager that insists gets its way until the window is shown again.
     int times = 0;
@@ -77,5 +77,5 @@ void tst_WindowPlaceKeeper::doesNotQuarrel()
     QTRY_COMPARE(mDialog->windowHandle()->position(), QPoint(60, 40));
 }
 
-QTEST_MAIN(tst_WindowPlaceKeeper)
+QTEST_MAIN(tst_windowplacekeeper)
 #include "tst_windowplacekeeper.moc"

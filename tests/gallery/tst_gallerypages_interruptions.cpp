@@ -1,0 +1,106 @@
+// Every touch widget of the gallery, interrupted in every way while a finger works it.
+#include "Interruptions.h"
+#include "gallery/GalleryPages.h"
+#include "gallery/GalleryScreen.h"
+
+#include <QApplication>
+#include <QFont>
+#include <QTest>
+
+class tst_gallerypages_interruptions : public QObject
+{
+    Q_OBJECT
+
+private Q_SLOTS:
+    void cleanup()
+    {
+        mPage.close();
+        APPEventFilter::release();
+    }
+    void everyWidget_data();
+    void everyWidget();
+    void everyClassIsThere();
+
+private:
+    void open(int page);
+    void destroy(QWidget* widget);
+
+    ManualClock mClock; // before all widgets
+    GalleryPage mPage;
+    static inline QStringList s_names;
+};
+
+// The page as new, with what it opens, and no finger on it.
+void tst_gallerypages_interruptions::open(int page)
+{
+    mPage.close();
+    mPage = GalleryPages::all().at(page)();
+    mPage.show();
+    QCoreApplication::processEvents();
+    Fingers posing;
+    mPage.pose(posing);
+    posing.cancel();
+    QCoreApplication::processEvents();
+    mClock.advance(5000);
+}
+
+// A row alone, anything else with all that it is a part of.
+void tst_gallerypages_interruptions::destroy(QWidget* widget)
+{
+    if (widget->window() != mPage.window.get() || widget->isWindow()) {
+        mPage.close();
+        return;
+    }
+    while (!qobject_cast<KSBaseItemWidget*>(widget) && widget->parentWidget() != mPage.window.get())
+        widget = widget->parentWidget();
+    delete widget;
+}
+
+void tst_gallerypages_interruptions::everyWidget_data()
+{
+    QTest::addColumn<int>("page");
+    for (int i = 0; i < GalleryPages::all().size(); ++i) {
+        const QString name = GalleryPages::all().at(i)().name;
+        QTest::newRow(qPrintable(name)) << i;
+    }
+}
+
+void tst_gallerypages_interruptions::everyWidget()
+{
+    QFETCH(int, page);
+    Interruptions touches(mClock);
+    touches.restore = [this, page] { open(page); };
+    touches.destroy = [this](QWidget* widget) { destroy(widget); };
+    QStringList result;
+    const QStringList kinds = touches.kinds();
+    for (const QString& name : kinds) {
+        for (const QString& problem : touches.problems(name))
+            result.append(name + QStringLiteral(" after ") + problem);
+    }
+    s_names += kinds;
+    QVERIFY2(result.isEmpty(), qPrintable(QLatin1Char('\n') + result.join(QLatin1Char('\n'))));
+}
+
+// The walk finds what there is to be found.
+void tst_gallerypages_interruptions::everyClassIsThere()
+{
+    const QString names = s_names.join(QLatin1Char('\n'));
+    for (const char* part :
+         {"KSPushbutton", "KSRadiobutton", "KSSLider", "KSCombobox", "CustomComboBoxView", "KSMenu",
+          "KSTabBar", "KSScrollBar", "KSTreeView", "KSBaseItemWidget", "movable", "checkable", "ToolsBar"}) {
+        QVERIFY2(names.contains(QLatin1String(part)), qPrintable(QLatin1String(part) + "\n" + names));
+    }
+}
+
+int main(int argc, char* argv[])
+{
+    const GalleryScreen screen;
+    QApplication application(argc, argv);
+    Q_INIT_RESOURCE(TitlerToolResource);
+    Q_INIT_RESOURCE(UILibrary);
+    QApplication::setFont(QFont(QStringLiteral("KST"), 12));
+    tst_gallerypages_interruptions test;
+    return QTest::qExec(&test, argc, argv);
+}
+
+#include "tst_gallerypages_interruptions.moc"

@@ -1,0 +1,539 @@
+// The texts of a title on all the ways that an operator goes away from them: nothing blank is saved, an
+// emptied title is, the soft keyboard is put away; and what a new text looks like.
+#include "../library/LibraryFixture.h"
+#include "../touchui/Taps.h"
+#include "app/APPEventFilter.h"
+#include "app/EditContextController.h"
+#include "app/TitlerPowerController.h"
+#include "app/TitlerWindow.h"
+#include "app/ToolsBar.h"
+#include "canvas/CanvasScene.h"
+#include "canvas/GraphicsText.h"
+#include "canvas/GraphicsView.h"
+#include "library/ArchiveItem.h"
+#include "library/ArchiveList.h"
+#include "library/ArchiveMenu.h"
+#include "library/FolderPicker.h"
+#include "library/TemplatePicker.h"
+#include "panel/ColorButton.h"
+#include "panel/ColorPalette.h"
+#include "panel/TextToolsPanel.h"
+#include "tests/app/RecordingCallBack.h"
+#include "tests/app/Siblings.h"
+#include "tests/properties/SoftKeyboardStandIn.h"
+#include "touchui/KSInputContext.h"
+#include "touchui/KSPushbutton.h"
+
+#include <QAction>
+#include <QApplication>
+#include <QComboBox>
+#include <QMetaEnum>
+#include <QPointingDevice>
+#include <QTest>
+#include <QTextCursor>
+#include <QTimer>
+#include <QXmlStreamReader>
+
+namespace
+{
+
+constexpr int ROW = 143;       // of the list, with the gap
+constexpr int PICTURE_X = 150; // in the list
+const QPoint EMPTY_PLACE(1200, 680);
+
+// What the panel says about a character.
+struct Looks {
+    int size = 44;
+    std::string family = "DejaVu Sans";
+    std::string color = "#C80000";
+    int bold = 1;
+    int italic = 1;
+    int kerning = 120;
+    int edge = 1;
+    int edgeWidth = 5;
+    std::string edgeColor = "#0D5EFF";
+
+    static Looks of(const TextStyle& style)
+    {
+        return {style.getFontSize(),
+                style.getFontFamily(),
+                style.getFontColor(),
+                style.isFontBold(),
+                style.isTextItalic(),
+                style.getTextKerning(),
+                style.isTextEdge(),
+                style.textEdge().getEdgeWidth(),
+                style.textEdge().getEdgeColor()};
+    }
+    void applyTo(TextStyle& style) const
+    {
+        style.setFontSize(size);
+        style.setFontFamily(family);
+        style.setFontColor(color);
+        style.setFontBold(bold);
+        style.setIsTextItalic(italic);
+        style.setTextKerning(kerning);
+        style.setIsTextEdge(edge);
+        TEdge outline;
+        outline.setEdgeWidth(edgeWidth);
+        outline.setEdgeColor(edgeColor);
+        style.setTextEdge(outline);
+    }
+    QString told() const
+    {
+        return QStringLiteral("%1 %2 %3 bold %4 italic %5 kerning %6 edge %7 %8 %9")
+            .arg(size)
+            .arg(QString::fromStdString(family), QString::fromStdString(color))
+            .arg(bold)
+            .arg(italic)
+            .arg(kerning)
+            .arg(edge)
+            .arg(edgeWidth)
+            .arg(QString::fromStdString(edgeColor));
+    }
+};
+
+} // namespace
+
+class tst_titlerwindow_texts : public QObject
+{
+    Q_OBJECT
+
+public:
+    enum Road {
+        OtherTitle,
+        ListMenu,
+        FolderDialog,
+        MoveMode,
+        UndoTapped,
+        DeleteTapped,
+        NewTextAgain,
+        Close,
+        CloseWithQuestion,
+        PowerOff,
+        Signal
+    };
+    Q_ENUM(Road)
+    enum Chosen { Selected, LeftAgain, Edited, AfterAnother, SelectedInNewLanguage };
+    Q_ENUM(Chosen)
+
+private Q_SLOTS:
+    void initTestCase();
+    void init();
+    void cleanup();
+    void blankTextIsNotSaved_data();
+    void blankTextIsNotSaved();
+    void undoneTextIsNotSavedAtClose();
+    void deletedOnlyTextStaysDeleted_data();
+    void deletedOnlyTextStaysDeleted();
+    void keyboardIsPutAway_data();
+    void keyboardIsPutAway();
+    void sizeFieldsKeyboardIsPutAway_data();
+    void sizeFieldsKeyboardIsPutAway();
+    void newTextLooksAsThePanelShows_data();
+    void newTextLooksAsThePanelShows();
+    void newLanguageShowsItsFamily();
+    void previewedColorIsNotTaken();
+    void previewedColorIsNotTakenInTheNextSession();
+
+private:
+    template <typename Enum>
+    static void rowsOf(const char* column)
+    {
+        QTest::addColumn<Enum>(column);
+        const QMetaEnum values = QMetaEnum::fromType<Enum>();
+        for (int i = 0; i < values.keyCount(); ++i)
+            QTest::newRow(values.key(i)) << Enum(values.value(i));
+    }
+    void show();
+    void take(Road road);
+    void tap(const QWidget* widget, const QPoint& place);
+    void tapText(int id);
+    void tapPanel(const char* name);
+    void tapTitle(int row) { tap(list(), QPoint(PICTURE_X, row * ROW + 60)); }
+    QAction* action(const QString& name) const;
+    Looks looksOfNewText(const QString& typed = QStringLiteral("x"));
+    QStringList textsInFile(const QString& stem) const;
+    ArchiveList* list() const { return mWindow->findChild<ArchiveList*>(); }
+    CanvasScene* scene() const { return mWindow->findChild<CanvasScene*>(); }
+    GraphicsView* view() const { return mWindow->findChild<GraphicsView*>(); }
+    TextToolsPanel* panel() const { return mWindow->findChild<TextToolsPanel*>(); }
+
+    LibraryFixture mFixture;
+    Siblings mSiblings;
+    SoftKeyboardStandIn mKeyboard;
+    QPointingDevice* mDevice = nullptr;
+    std::unique_ptr<TitlerWindow> mWindow;
+    QString mFolder;
+    Answers mAnswers;
+};
+
+void tst_titlerwindow_texts::initTestCase()
+{
+    QVERIFY(mSiblings.listenOnFreePorts());
+    Q_INIT_RESOURCE(UILibrary);
+    Q_INIT_RESOURCE(TitlerToolResource);
+    mDevice = QTest::createTouchDevice();
+    mDevice->setParent(this);
+}
+
+void tst_titlerwindow_texts::init()
+{
+    APPEventFilter::instance();
+    mWindow = std::make_unique<TitlerWindow>(true, nullptr);
+    pMainWindow = mWindow.get();
+    mWindow->setRealClose(false);
+    KSInputContext::instance()->setKeyBoardController(&mKeyboard);
+    mFolder = mFixture.makeFolder(QStringLiteral("texts"));
+    LibraryFixture::fillFolder(mFolder, {"a", "b"});
+    const auto styled = LibraryFixture::makeRecord(mFolder, QStringLiteral("styled"), QStringLiteral("MMM"));
+    for (TextStyle* style : styled->text().front()->textItems())
+        Looks().applyTo(*style);
+    auto* other = LibraryFixture::makeText(QStringLiteral("other"), 2, 100, 500);
+    other->textItems().front()->setFontSize(96);
+    styled->setText({styled->text().front(), other});
+    ArchiveController().saveNewArchive(mFolder, styled.get());
+    LibraryFixture::writeOrder(mFolder, {"a", "b", "styled"});
+    show();
+}
+
+void tst_titlerwindow_texts::show()
+{
+    mWindow->showTitlerWindow({_titler_paramter::CREATE_OR_EDIT, mFolder.toStdWString()});
+    QVERIFY(QTest::qWaitForWindowActive(mWindow.get()));
+    QTRY_VERIFY(list()->archiveItem(2) && list()->archiveItem(2)->hasChildWidgets());
+    QCOMPARE(QFileInfo(list()->getSelectedArchive()->getArchiveDataPath()).completeBaseName(),
+             QStringLiteral("a"));
+}
+
+void tst_titlerwindow_texts::cleanup()
+{
+    EditContextController::getInstance()->resultCallBack(nullptr);
+    EditContextController::getInstance()->setITitlerNoCallBack();
+    if (mWindow->isVisible())
+        mWindow->closeTitlerMainWindow();
+    mWindow.reset();
+    pMainWindow = nullptr;
+    APPEventFilter::release();
+}
+
+void tst_titlerwindow_texts::tap(const QWidget* widget, const QPoint& place)
+{
+    tapOnce(mWindow.get(), mDevice, widget->mapTo(mWindow.get(), place));
+    view()->mouseClick(); // no double tap follows
+}
+
+void tst_titlerwindow_texts::tapText(int id)
+{
+    const GraphicsText* item = scene()->findTextItem(id);
+    QVERIFY(item);
+    tap(view(), view()->mapFromScene(item->sceneBoundingRect().center()));
+}
+
+void tst_titlerwindow_texts::tapPanel(const char* name)
+{
+    const auto* widget = panel()->findChild<QWidget*>(QLatin1String(name));
+    QVERIFY(widget && widget->isEnabled());
+    tap(widget, widget->rect().center());
+}
+
+QAction* tst_titlerwindow_texts::action(const QString& name) const
+{
+    const auto actions = mWindow->findChildren<QAction*>(QString(), Qt::FindDirectChildrenOnly);
+    for (QAction* found : actions) {
+        if (found->text().startsWith(name))
+            return found;
+    }
+    return nullptr;
+}
+
+void tst_titlerwindow_texts::take(Road road)
+{
+    switch (road) {
+    case OtherTitle:
+        tapTitle(1);
+        break;
+    case ListMenu: {
+        list()->itemRightPressedEvent(list()->archiveItem(0), QPoint(20, 20), list());
+        auto* menu = list()->findChild<ArchiveMenu*>();
+        list()->selectOptionMenuItem(menu->action(ArchiveAction::ACTION_COPY));
+        list()->slotHideOptionMenu();
+        break;
+    }
+    case FolderDialog: {
+        auto* dialog = mWindow->findChild<FolderPicker*>();
+        QTimer::singleShot(0, dialog, [dialog] { dialog->done(QDialog::Rejected); });
+        mWindow->openFolderDialog();
+        break;
+    }
+    case MoveMode:
+        for (KSPushbutton* button : mWindow->findChildren<KSPushbutton*>()) {
+            if (button->text() == TitlerWindow::tr("Move"))
+                button->click();
+        }
+        QVERIFY(mWindow->archiveListIsMoveMode());
+        mWindow->slotChangeDoneToMoveMode();
+        break;
+    case UndoTapped:
+        Q_EMIT mWindow->findChild<ToolsBar*>()->undoButtonClicked();
+        action(QStringLiteral("Undo"))->trigger();
+        break;
+    case DeleteTapped:
+        mWindow->pressDelectButton();
+        break;
+    case NewTextAgain:
+        mWindow->slotNewTextButtonClicked();
+        break;
+    case Close:
+        mWindow->closeTitlerWindow();
+        break;
+    case CloseWithQuestion:
+        EditContextController::getInstance()->resultCallBack(new RecordingCallBack(mAnswers));
+        EditContextController::getInstance()->insertFilePath(L"new.xml");
+        mWindow->closeTitlerWindow();
+        break;
+    case PowerOff:
+        TitlerPowerController::getInstance()->powerOff();
+        break;
+    case Signal:
+        mWindow->endProcess();
+        break;
+    }
+}
+
+QStringList tst_titlerwindow_texts::textsInFile(const QString& stem) const
+{
+    QFile file(mFolder + '/' + stem + ".xml");
+    if (!file.open(QIODevice::ReadOnly))
+        return {QStringLiteral("no file")};
+    QStringList texts;
+    QXmlStreamReader reader(&file);
+    while (!reader.atEnd()) {
+        if (reader.readNext() == QXmlStreamReader::StartElement && reader.name() == QLatin1String("content"))
+            texts.append(reader.attributes().value(QLatin1String("text")).toString());
+    }
+    return texts;
+}
+
+void tst_titlerwindow_texts::blankTextIsNotSaved_data()
+{
+    rowsOf<Road>("road");
+}
+
+void tst_titlerwindow_texts::blankTextIsNotSaved()
+{
+    QFETCH(Road, road);
+    mWindow->slotNewTextButtonClicked();
+    QVERIFY(scene()->findTextItem(2));
+    mKeyboard.type(QStringLiteral(" \n "));
+    take(road);
+    QCOMPARE(textsInFile(QStringLiteral("a")), QStringList{"a"});
+    if (mWindow->isVisible())
+        mWindow->closeTitlerWindow();
+    QCOMPARE(textsInFile(QStringLiteral("a")), QStringList{"a"});
+}
+
+void tst_titlerwindow_texts::undoneTextIsNotSavedAtClose()
+{
+    mWindow->slotNewTextButtonClicked();
+    tap(view(), EMPTY_PLACE);
+    QVERIFY(!scene()->findTextItem(2));
+    take(UndoTapped);
+    QVERIFY(scene()->findTextItem(2));
+    mWindow->closeTitlerWindow();
+    QCOMPARE(textsInFile(QStringLiteral("a")), QStringList{"a"});
+
+    // Everything that was typed is taken back.
+    show();
+    mWindow->slotNewTextButtonClicked();
+    mKeyboard.type(QStringLiteral("abc"));
+    take(UndoTapped);
+    QVERIFY(scene()->findTextItem(2) && scene()->findTextItem(2)->isBlank());
+    mWindow->closeTitlerWindow();
+    QCOMPARE(textsInFile(QStringLiteral("a")), QStringList{"a"});
+}
+
+void tst_titlerwindow_texts::deletedOnlyTextStaysDeleted_data()
+{
+    rowsOf<Road>("road");
+}
+
+// The title has no background: nothing at all is left of it.
+void tst_titlerwindow_texts::deletedOnlyTextStaysDeleted()
+{
+    QFETCH(Road, road);
+    tapText(1);
+    mWindow->pressDelectButton();
+    QVERIFY(scene()->getTextItemList().isEmpty());
+    take(road);
+    const QStringList wanted = road == UndoTapped ? QStringList{"a"} : QStringList();
+    QCOMPARE(textsInFile(QStringLiteral("a")), wanted);
+    if (mWindow->isVisible())
+        mWindow->closeTitlerWindow();
+    mWindow->waitUntilSaved();
+    QCOMPARE(textsInFile(QStringLiteral("a")), wanted);
+    if (road == UndoTapped)
+        return;
+    for (const char* picture : {"_1920.png", "_960.png"}) {
+        const QImage image = QImage(mFolder + "/a" + picture).convertToFormat(QImage::Format_ARGB32);
+        QVERIFY2(!image.isNull(), picture);
+        QImage empty(image.size(), image.format());
+        empty.fill(Qt::transparent);
+        QVERIFY2(image == empty, picture);
+    }
+    QImage black(240, 135, QImage::Format_RGB32);
+    black.fill(Qt::black);
+    QCOMPARE(QImage(mFolder + "/a_240S.png").convertToFormat(QImage::Format_RGB32), black);
+    QCOMPARE(QImage(mFolder + "/a_240.png").convertToFormat(QImage::Format_RGB32), LibraryFixture::checker());
+}
+
+void tst_titlerwindow_texts::keyboardIsPutAway_data()
+{
+    rowsOf<Road>("road");
+}
+
+void tst_titlerwindow_texts::keyboardIsPutAway()
+{
+    QFETCH(Road, road);
+    tapText(1);
+    tapText(1);
+    QVERIFY(scene()->itemIsEditorInteraction());
+    QVERIFY(mKeyboard.isUp());
+    mKeyboard.type(QStringLiteral("x"));
+    take(road);
+    if (road == NewTextAgain) {
+        QVERIFY(mKeyboard.isUp()); // for the new text
+        take(Close);
+    }
+    QVERIFY(!mKeyboard.isUp());
+    QVERIFY(KSInputContext::isSoftKeyboardClosed());
+    if (road == CloseWithQuestion)
+        QVERIFY(mWindow->isVisible());
+}
+
+void tst_titlerwindow_texts::sizeFieldsKeyboardIsPutAway_data()
+{
+    rowsOf<Road>("road");
+}
+
+void tst_titlerwindow_texts::sizeFieldsKeyboardIsPutAway()
+{
+    QFETCH(Road, road);
+    tapText(1);
+    tapText(1);
+    auto* box = panel()->findChild<QWidget*>(QStringLiteral("SizeBox"));
+    QVERIFY(box);
+    tap(box, QPoint(20, box->height() / 2));
+    QVERIFY(mKeyboard.isUp() && mKeyboard.isForLine());
+    take(road);
+    if (road == NewTextAgain) {
+        QVERIFY(mKeyboard.isUp() && !mKeyboard.isForLine());
+        return;
+    }
+    QVERIFY(!mKeyboard.isUp());
+    mKeyboard.settle();
+    QVERIFY(KSInputContext::isSoftKeyboardClosed());
+}
+
+Looks tst_titlerwindow_texts::looksOfNewText(const QString& typed)
+{
+    mWindow->slotNewTextButtonClicked();
+    const GraphicsText* item = scene()->getTextItemList().constLast();
+    mKeyboard.type(typed);
+    const auto& styles = item->getItemTText()->textItems();
+    return styles.empty() ? Looks{0} : Looks::of(*styles.front());
+}
+
+void tst_titlerwindow_texts::newTextLooksAsThePanelShows_data()
+{
+    rowsOf<Chosen>("chosen");
+}
+
+void tst_titlerwindow_texts::newTextLooksAsThePanelShows()
+{
+    QFETCH(Chosen, chosen);
+    tapTitle(2);
+    switch (chosen) {
+    case Selected:
+        tapText(1);
+        break;
+    case LeftAgain:
+        tapText(1);
+        tap(view(), EMPTY_PLACE);
+        QVERIFY(!scene()->itemIsSelectionMode());
+        break;
+    case Edited:
+        tapText(1);
+        tapText(1);
+        QVERIFY(scene()->itemIsEditorInteraction());
+        break;
+    case AfterAnother:
+        tapText(2);
+        tapText(1);
+        break;
+    case SelectedInNewLanguage:
+        mWindow->slotInputLanguageChanged(SystemSetupDef::emInputLanguageJapanese);
+        tapText(1);
+        break;
+    }
+    QCOMPARE(looksOfNewText().told(), Looks().told());
+}
+
+// A text in a language just chosen begins with the family of that language, and the panel says so before.
+void tst_titlerwindow_texts::newLanguageShowsItsFamily()
+{
+    const auto* family = panel()->findChild<QComboBox*>(QStringLiteral("FamilyBox"));
+    QVERIFY(family);
+    const QString before = family->currentText();
+    mWindow->slotInputLanguageChanged(SystemSetupDef::emInputLanguageUnknown);
+    QCOMPARE(family->currentText(), before);
+    mWindow->slotInputLanguageChanged(SystemSetupDef::emInputLanguageJapanese);
+    QCOMPARE(family->currentText(), QStringLiteral("KST Japanese Pro"));
+    QCOMPARE(looksOfNewText(QString::fromUtf8("速")).family, std::string("KST Japanese Pro"));
+    // A selected text is shown as it is.
+    tap(view(), EMPTY_PLACE);
+    tapText(1);
+    const QString shown = family->currentText();
+    mWindow->slotInputLanguageChanged(SystemSetupDef::emInputLanguageKorean);
+    QCOMPARE(family->currentText(), shown);
+}
+
+void tst_titlerwindow_texts::previewedColorIsNotTaken()
+{
+    tapTitle(2);
+    tapText(1);
+    tapPanel("TextColor");
+    auto* palette = panel()->findChild<ColorPalette*>();
+    QVERIFY(palette && palette->isVisible());
+    palette->findChildren<ColorButton*>().at(1)->click();
+    QCOMPARE(scene()->findTextItem(1)->getItemTText()->textItems().front()->getFontColor(),
+             std::string("#C6C6C6"));
+    QCOMPARE(looksOfNewText().told(), Looks().told());
+    QVERIFY(!palette->isVisible());
+}
+
+void tst_titlerwindow_texts::previewedColorIsNotTakenInTheNextSession()
+{
+    const Looks remembered = looksOfNewText();
+    tap(view(), EMPTY_PLACE);
+    tapText(1);
+    tapPanel("TextColor");
+    panel()->findChild<ColorPalette*>()->findChildren<ColorButton*>().at(15)->click();
+    mWindow->closeTitlerWindow();
+    QVERIFY(!mWindow->isVisible());
+    show();
+    QCOMPARE(looksOfNewText().color, remembered.color);
+}
+
+int main(int argc, char** argv)
+{
+    KSInputContext::install();
+    QApplication application(argc, argv);
+    application.setObjectName(QStringLiteral("Titler"));
+    QApplication::setQuitOnLastWindowClosed(false);
+    tst_titlerwindow_texts test;
+    QTEST_SET_MAIN_SOURCE_PATH
+    return QTest::qExec(&test, argc, argv);
+}
+
+#include "tst_titlerwindow_texts.moc"
