@@ -6,6 +6,7 @@
 #include "document/TText.h"
 #include "support/FileSyncQueue.h"
 #include "support/LeftoverSweep.h"
+#include "tests/support/RandomSeed.h"
 
 #include <QCoreApplication>
 #include <QDir>
@@ -68,6 +69,8 @@ private Q_SLOTS:
     {
         QFETCH(QString, mode);
         QTemporaryDir folder;
+        const RandomSeed seed(QRandomGenerator::global()->generate());
+        QRandomGenerator random(seed);
         int reads = 0;
         for (int round = 0; round < 15; ++round) {
             QProcess child;
@@ -76,7 +79,7 @@ private Q_SLOTS:
             QTRY_VERIFY(QFile::exists(folder.filePath("title_1920.png")));
             QElapsedTimer timer;
             timer.start();
-            const int lifetime = 5 + QRandomGenerator::global()->bounded(60);
+            const int lifetime = 5 + random.bounded(60);
             while (timer.elapsed() < lifetime) {
                 ++reads;
                 QVERIFY2(filesAreWhole(folder.path()), qPrintable(mode));

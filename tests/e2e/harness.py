@@ -19,6 +19,7 @@ import xml.etree.ElementTree
 
 HERE = os.path.dirname(os.path.abspath(__file__))
 sys.path.insert(0, os.path.join(os.path.dirname(os.path.dirname(HERE)), "scripts"))
+sys.path.insert(0, os.path.dirname(HERE))
 
 import session  # noqa: E402  pylint: disable=wrong-import-position
 

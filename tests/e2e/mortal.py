@@ -1,8 +1,6 @@
 """For tests that kill the titler in the middle of its work."""
-import random
 import signal
 import threading
-import time
 import unittest.mock
 
 import harness
@@ -36,12 +34,6 @@ class MortalTitler:
             lambda: any(call["topWindow"] == harness.TOP_WINDOW_MAIN
                         for call in self.calls("MessageCenter", "setTopWindow", start)),
             20 * harness.SLOW, "the end of the session")
-
-    @staticmethod
-    def seeded():
-        """Random numbers that are others in each run, and the seed that gives them again."""
-        seed = random.Random(time.time_ns()).randrange(2 ** 32)
-        return random.Random(seed), seed
 
     def kill_during(self, work, seconds):
         """Kills the titler so long after work has begun; when work is done sooner, then."""

@@ -1,6 +1,5 @@
 """Title folders as disks and foreign programs leave them, and disks without room: the window stays usable."""
 import os
-import random
 import re
 import shutil
 import subprocess
@@ -8,6 +7,7 @@ import unittest
 
 import harness
 import wire
+from seededrandom import SeededRandom
 
 MISSING_FONT, DISK_FULL_CREATE, DISK_FULL_PASTE, CONFIRM_CLOSE = 109, 114, 116, 117
 OK = 2  # the button of a question
@@ -78,7 +78,7 @@ class TitleFolders(harness.TitlerTest):
         return messages
 
     def test_torn_and_oversized_title_files(self):
-        rng = random.Random(20261121)
+        rng = SeededRandom(20261121)
 
         def contents(good):
             yield b""
@@ -125,7 +125,7 @@ class TitleFolders(harness.TitlerTest):
         damages = {
             "missing": lambda name: os.remove(name),
             "truncated": lambda name: write(name, read(name)[:len(read(name)) // 2]),
-            "noise": lambda name: write(name, random.Random(1).randbytes(5000)),
+            "noise": lambda name: write(name, SeededRandom(1).randbytes(5000)),
             "empty": lambda name: write(name, b""),
             "folder": lambda name: (os.remove(name), os.mkdir(name)),
             "link to itself": lambda name: (os.remove(name), os.symlink(os.path.basename(name), name)),

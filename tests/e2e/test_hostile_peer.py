@@ -1,9 +1,9 @@
 """A peer that sends what no sibling would: the titler drops it, keeps its files and goes on serving the others."""
-import random
 import unittest
 
 import harness
 import wire
+from seededrandom import SeededRandom
 
 BAD_SIZES = (0, -1, -2 ** 31, -2 ** 63, wire.MAX_PAYLOAD + 1, wire.FRAME_SIZE, 2 ** 31, 2 ** 32, 2 ** 62, 2 ** 63 - 1)
 STRANGE_IDS = (-2 ** 63, -2 ** 31, -1, 0, 2 ** 31, 2 ** 32, 2 ** 32 + 117, 2 ** 62, 2 ** 63 - 1)
@@ -15,7 +15,7 @@ MEMORY_ALLOWANCE = 24 * 1024
 class HostilePeer(harness.TitlerTest):
     def setUp(self):
         super().setUp()
-        self.rng = random.Random(20261121)
+        self.rng = SeededRandom(20261121)
         self.connections = []
         self.addCleanup(lambda: [connection.close() for connection in self.connections])
         self.title = self.titles(self.folder())[0]

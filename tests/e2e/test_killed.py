@@ -1,4 +1,5 @@
-"""A titler that is killed at any moment of its work. TITLER_KILLS is the number of kills."""
+"""A titler that is killed at any moment of its work. TITLER_KILLS is the number of kills; TITLER_SEED repeats a run,
+as far as a machine can."""
 import os
 import signal
 import unittest
@@ -6,6 +7,7 @@ import unittest
 import harness
 import wire
 from mortal import MortalTitler
+from seededrandom import SeededRandom
 
 KILLS = int(os.environ.get("TITLER_KILLS", "25"))
 
@@ -27,10 +29,10 @@ class Killed(MortalTitler, harness.TitlerTest):
             self.close_window()
 
     def test_files_are_whole_after_a_kill_at_any_moment(self):
-        rng, seed = self.seeded()
+        rng = SeededRandom()
         folder = self.folder()
         for turn in range(KILLS):
-            with self.subTest(turn=turn, seed=seed):
+            with self.subTest(turn=turn, seed=rng.first_seed):
                 titles = self.titles(folder)
                 # From the middle of the first edit to well into the writing of pictures.
                 self.kill_during(lambda: self.edit_and_save(titles, rng), rng.uniform(0.3, 2.5) * harness.SLOW)

@@ -1,7 +1,6 @@
 """A titler that is killed at any moment of an operator's session in the title library: the next one shows every title
 that was saved. TITLER_KILLS is the number of sessions; TITLER_SEED repeats a run, as far as a machine can."""
 import os
-import random
 import shutil
 import time
 import unittest
@@ -10,6 +9,7 @@ import harness
 import wire
 from librarysession import COPY, FOLDER, LibrarySession
 from mortal import MortalTitler
+from seededrandom import SeededRandom
 
 KILLS = int(os.environ.get("TITLER_KILLS", "5"))
 
@@ -92,10 +92,7 @@ class KilledSession(MortalTitler, LibrarySession):
         self.clear()
 
     def test_every_saved_title_is_there_after_a_kill(self):
-        rng, seed = self.seeded()
-        if "TITLER_SEED" in os.environ:
-            seed = int(os.environ["TITLER_SEED"])
-            rng = random.Random(seed)
+        rng = SeededRandom()
         self.note_saved()
         begin = time.monotonic()
         self.play()
@@ -106,7 +103,7 @@ class KilledSession(MortalTitler, LibrarySession):
                 self.kill_and_look(rng.uniform(0, length))
             except Exception as error:
                 # A turn begins with what the one before it has left.
-                raise AssertionError(f"turn {turn} of the run with seed {seed}, in {self.doing}") from error
+                raise AssertionError(f"turn {turn} of the run with seed {rng.first_seed}, in {self.doing}") from error
             print(f"turn {turn}: killed in {self.doing}", flush=True)
 
 

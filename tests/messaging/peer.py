@@ -9,11 +9,14 @@ Usage: peer.py PROBE
 
 import json
 import os
-import random
 import socket
 import struct
 import subprocess
 import sys
+
+sys.path.insert(0, os.path.dirname(os.path.dirname(os.path.abspath(__file__))))
+
+from seededrandom import SeededRandom  # noqa: E402  pylint: disable=wrong-import-position
 
 FRAME_SIZE = 20480
 HEADER = struct.Struct("<qqqqB7xqB7x")
@@ -304,7 +307,7 @@ def check_damage(peer):
 
 def main():
     peer = Peer(sys.argv[1])
-    rng = random.Random(20261112)
+    rng = SeededRandom(20261112)
     check_records(peer, rng)
     check_session_result(peer)
     check_any_form_is_read(peer)

@@ -18,6 +18,7 @@
 #include "messaging/services/TitlerAdapter.h"
 #include "messaging/services/TitlerParams.h"
 #include "tests/messaging/LoopSender.h"
+#include "tests/support/RandomSeed.h"
 
 #include <QJsonDocument>
 #include <QTest>
@@ -606,7 +607,8 @@ void tst_servicetable::adaptersWithoutTarget()
 
 void tst_servicetable::randomPayloadsReachNothingBad()
 {
-    std::mt19937 random(4711);
+    const RandomSeed seed(4711);
+    std::mt19937 random(seed);
     const auto bombard = [&](PTC::IAdapterBase& adapter) {
         for (int round = 0; round < 300; ++round) {
             const long size = static_cast<long>(random() % 40) + 1;

@@ -8,6 +8,7 @@
 #include "tests/messaging/RecordingAdapter.h"
 #include "tests/messaging/TestPorts.h"
 #include "tests/messaging/TestSocket.h"
+#include "tests/support/RandomSeed.h"
 
 #include <QDir>
 #include <QTest>
@@ -298,7 +299,8 @@ void tst_socketremotereceiver::openConnectionsAreLimited()
 void tst_socketremotereceiver::randomFrames()
 {
     TestSocket peer(SERVER);
-    std::srand(1);
+    const RandomSeed seed(1);
+    std::srand(seed);
     for (int i = 0; i < 50; ++i) {
         QByteArray noise(20480, '\0');
         for (char& byte : noise) {

@@ -1,6 +1,7 @@
 // The wire form of the records: there and back, and from messages that are cut or mean nothing.
 #include "messaging/services/RecordPacking.h"
 #include "messaging/services/TitlerParams.h"
+#include "tests/support/RandomSeed.h"
 
 #include <QByteArray>
 #include <QTest>
@@ -198,7 +199,8 @@ void tst_wirerecord::everyTruncation()
 
 void tst_wirerecord::randomPayloads()
 {
-    std::mt19937 random(12345);
+    const RandomSeed seed(12345);
+    std::mt19937 random(seed);
     for (const Case& c : m_cases) {
         for (int round = 0; round < 2000; ++round) {
             QByteArray noise(static_cast<qsizetype>(random() % 64), '\0');
@@ -215,7 +217,8 @@ void tst_wirerecord::randomPayloads()
 
 void tst_wirerecord::damagedPayloads()
 {
-    std::mt19937 random(99);
+    const RandomSeed seed(99);
+    std::mt19937 random(seed);
     for (const Case& c : m_cases) {
         for (qsizetype at = 0; at < c.whole.size(); ++at) {
             QByteArray damaged = c.whole;

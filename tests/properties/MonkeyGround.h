@@ -28,17 +28,10 @@ inline TitlerWindow* makeWaitingWindow()
     return pMainWindow;
 }
 
-// Shared parts of the random tests in this folder: numbers from the environment, an application whose timers
-// can be stopped, a folder for the data, and a report of the touch locks.
+// Shared parts of the tests that play with the window: an application whose timers can be stopped, a folder
+// for the data, and a report of the touch locks.
 namespace MonkeyGround
 {
-
-inline int number(const char* variable, int otherwise)
-{
-    bool ok = false;
-    const int value = qEnvironmentVariableIntValue(variable, &ok);
-    return ok && value > 0 ? value : otherwise;
-}
 
 // An application whose timers can be stopped, so that a run does not depend on the speed of the machine.
 class Application : public QApplication

@@ -1,4 +1,5 @@
 #include "RandomEditor.h"
+#include "tests/support/RandomSeed.h"
 
 #include <QElapsedTimer>
 #include <QFile>
@@ -22,9 +23,6 @@ private Q_SLOTS:
     void focusCommandsOnACleanStack();
 
 private:
-    static int number(const char* variable, int otherwise);
-
-    quint32 m_seed = 0;
     int m_edits = 0;
 };
 
@@ -318,20 +316,12 @@ void ignoreDebug(QtMsgType type, const QMessageLogContext&, const QString& text)
 
 } // namespace
 
-int tst_canvasscene_undo::number(const char* variable, int otherwise)
-{
-    bool ok = false;
-    const int value = qEnvironmentVariableIntValue(variable, &ok);
-    return ok && value > 0 ? value : otherwise;
-}
-
 void tst_canvasscene_undo::initTestCase()
 {
     qRegisterMetaType<TText*>("TText*");
     MessageBoxController::setProvider([]() -> MessageBoxController* { return messages; }, []() {});
-    m_seed = quint32(number("TITLER_SEED", DefaultSeed));
-    m_edits = number("TITLER_EDITS", DefaultEdits);
-    qInfo("seed %u, %d edits", m_seed, m_edits);
+    m_edits = runLength("TITLER_EDITS", DefaultEdits);
+    qInfo("seed %u, %d edits", quint32(RandomSeed(DefaultSeed)), m_edits);
     // Every step saves the title; in memory that does not wait for a disk.
     if (QFileInfo(QStringLiteral("/dev/shm")).isWritable())
         qputenv("TMPDIR", "/dev/shm");
@@ -361,7 +351,8 @@ void tst_canvasscene_undo::undoAllRedoAll()
     canvas.open(someTexts());
     canvas.scene->saveArchive();
     History history(canvas);
-    RandomEditor operator_(canvas, m_seed, 16);
+    const RandomSeed seed(DefaultSeed);
+    RandomEditor operator_(canvas, seed, 16);
     const End start(canvas);
     for (int i = 0; i < m_edits; ++i) {
         operator_.edit();
@@ -392,8 +383,8 @@ void tst_canvasscene_undo::undoAllRedoAll()
     }
     operator_.leave();
     compare(End(canvas), end);
-    qInfo("seed %u: %d edits, %d steps; edited in %lld ms, undone in %lld, redone in %lld", m_seed, m_edits,
-          steps, edited, undone, clock.elapsed());
+    qInfo("seed %u: %d edits, %d steps; edited in %lld ms, undone in %lld, redone in %lld", quint32(seed),
+          m_edits, steps, edited, undone, clock.elapsed());
 }
 
 // With the window's limit, longer texts, and undo and redo in between that cut branches off.
@@ -404,7 +395,8 @@ void tst_canvasscene_undo::shortHistory()
     canvas.open(someTexts());
     canvas.scene->saveArchive();
     History history(canvas);
-    RandomEditor operator_(canvas, m_seed + 1, 60);
+    const RandomSeed seed(DefaultSeed);
+    RandomEditor operator_(canvas, seed + 1, 60);
     const int rounds = qMax(1, m_edits / 100);
     for (int round = 0; round < rounds; ++round) {
         for (int i = 0; i < 20; ++i) {
@@ -450,7 +442,8 @@ void tst_canvasscene_undo::focusCommandsOnACleanStack()
             canvas.stack.push(command);
     };
     History history(canvas);
-    RandomEditor operator_(canvas, m_seed + 2, 16);
+    const RandomSeed seed(DefaultSeed);
+    RandomEditor operator_(canvas, seed + 2, 16);
     QList<int> ids;
     connect(canvas.scene.get(), &CanvasScene::signalPushUndoCommandIntoStack, this,
             [&ids](const QUndoCommand* command) { ids.append(command->id()); });

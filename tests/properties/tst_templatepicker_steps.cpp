@@ -2,12 +2,13 @@
 // with them: after each step the grid, the choice, the order file and the folders on disk must be those of a
 // plain list of names.
 //
-// TITLER_PROPERTY_STEPS and TITLER_PROPERTY_SEED change the length and the course.
+// TITLER_STEPS changes the length, TITLER_SEED the course.
 #include "tests/library/TemplateFixture.h"
 
 #include "library/TemplateItem.h"
 #include "library/TemplatePicker.h"
 #include "library/TemplateTab.h"
+#include "tests/support/RandomSeed.h"
 #include "touchui/KSPushbutton.h"
 
 #include <QLabel>
@@ -20,13 +21,6 @@ namespace
 
 const int DEFAULT_STEPS = 600;
 const int COMFORTABLE_COUNT = 9; // around which the number of templates moves
-
-int fromEnvironment(const char* name, int otherwise)
-{
-    bool isNumber = false;
-    const int number = qEnvironmentVariableIntValue(name, &isNumber);
-    return isNumber ? number : otherwise;
-}
 
 } // namespace
 
@@ -89,9 +83,9 @@ void tst_templatepicker_steps::initTestCase()
 
 void tst_templatepicker_steps::randomOrder()
 {
-    const int steps = fromEnvironment("TITLER_PROPERTY_STEPS", DEFAULT_STEPS);
-    const auto seed = quint32(fromEnvironment("TITLER_PROPERTY_SEED", 20267));
-    qInfo("seed %u", seed);
+    const int steps = runLength("TITLER_STEPS", DEFAULT_STEPS);
+    const RandomSeed seed(20267);
+    qInfo("seed %u", quint32(seed));
     mRandom.seed(seed);
     mFixture.resetTemplates();
     startPicker();
@@ -102,7 +96,7 @@ void tst_templatepicker_steps::randomOrder()
         const QString failure = verify();
         QVERIFY2(failure.isEmpty(),
                  qPrintable(QStringLiteral("seed %1, step %2: %3\n%4")
-                                .arg(seed)
+                                .arg(quint32(seed))
                                 .arg(i)
                                 .arg(failure, log.mid(qMax(0, int(log.size()) - 12)).join('\n'))));
     }

@@ -10,6 +10,7 @@
 #include "document/TitleParser.h"
 #include "document/TitleParserUtility.h"
 #include "tests/app/Siblings.h"
+#include "tests/support/RandomSeed.h"
 
 #include <QDir>
 #include <QElapsedTimer>
@@ -98,15 +99,13 @@ private:
     Siblings mSiblings;
     TitlerWindow* mWindow = nullptr;
     QPointingDevice* mDevice = nullptr;
-    quint32 mSeed = 0;
     int mTouches = 0;
 };
 
 void tst_titlerwindow_editmonkey::initTestCase()
 {
-    mSeed = quint32(number("TITLER_SEED", DefaultSeed));
-    mTouches = number("TITLER_TOUCHES", DefaultTouches);
-    qInfo("seed %u, %d touches", mSeed, mTouches);
+    mTouches = runLength("TITLER_TOUCHES", DefaultTouches);
+    qInfo("seed %u, %d touches", quint32(RandomSeed(DefaultSeed)), mTouches);
     MonkeyGround::showErrorsOnly();
     QVERIFY(mSiblings.listenOnFreePorts());
     mDevice = QTest::createTouchDevice();
@@ -182,7 +181,8 @@ void tst_titlerwindow_editmonkey::manyTouches()
     QElapsedTimer clock;
     clock.start();
 
-    CanvasFingers fingers(*mWindow, mDevice, mSeed);
+    const RandomSeed seed(DefaultSeed);
+    CanvasFingers fingers(*mWindow, mDevice, seed);
     for (int steps = 1; fingers.touches() < mTouches; ++steps) {
         fingers.act();
         if (!fingers.isTouching()) {
@@ -228,8 +228,8 @@ void tst_titlerwindow_editmonkey::manyTouches()
     const QByteArray written = bytesOf(path);
     QVERIFY(TitleParser().writeOneTitle(&saved));
     QCOMPARE(bytesOf(path), written);
-    fprintf(stderr, "seed %u: %d touches in %lld ms, %d texts left\n", mSeed, fingers.touches(), touched,
-            int(shown.size()));
+    fprintf(stderr, "seed %u: %d touches in %lld ms, %d texts left\n", quint32(seed), fingers.touches(),
+            touched, int(shown.size()));
 
     mWindow->closeTitlerWindow();
     QVERIFY(!mWindow->isVisible());
@@ -247,7 +247,7 @@ QByteArray tst_titlerwindow_editmonkey::replay(const QString& name)
     QProcessEnvironment environment = QProcessEnvironment::systemEnvironment();
     QDir(mData.path()).mkpath(name);
     environment.insert(QStringLiteral("XDG_DATA_HOME"), mData.filePath(name));
-    environment.insert(QStringLiteral("TITLER_SEED"), QString::number(mSeed));
+    environment.insert(QStringLiteral("TITLER_SEED"), QString::number(quint32(RandomSeed(DefaultSeed))));
     environment.insert(QStringLiteral("TITLER_TOUCHES"), QString::number(ReplayedTouches));
     environment.insert(QString::fromLatin1(DigestVariable), mData.filePath(name + ".txt"));
     process.setProcessEnvironment(environment);

@@ -3,7 +3,7 @@
 // records, order file, pictures, selection and context list must be those of the model, and nothing that can
 // be brought back may be gone from disk.
 //
-// TITLER_PROPERTY_STEPS and TITLER_PROPERTY_SEED change the length and the course.
+// TITLER_STEPS changes the length, TITLER_SEED the course.
 #include "../library/TemplateFixture.h"
 #include "LibraryModel.h"
 #include "app/APPEventFilter.h"
@@ -20,6 +20,7 @@
 #include "library/TemplateTab.h"
 #include "messaging/services/ServiceFamilies.h"
 #include "tests/app/Siblings.h"
+#include "tests/support/RandomSeed.h"
 #include "touchui/KSInputContext.h"
 #include "touchui/KSPushbutton.h"
 
@@ -66,13 +67,6 @@ struct Stamp {
     }
     bool operator==(const Stamp&) const = default;
 };
-
-int fromEnvironment(const char* name, int otherwise)
-{
-    bool isNumber = false;
-    const int number = qEnvironmentVariableIntValue(name, &isNumber);
-    return isNumber ? number : otherwise;
-}
 
 LibraryModel::Texts textsOf(const Archive& archive)
 {
@@ -245,10 +239,10 @@ void tst_titlerwindow_library::request()
 
 void tst_titlerwindow_library::randomSession()
 {
-    const int steps = fromEnvironment("TITLER_PROPERTY_STEPS", DEFAULT_STEPS);
-    const quint32 seed = quint32(fromEnvironment("TITLER_PROPERTY_SEED", 20261));
+    const int steps = runLength("TITLER_STEPS", DEFAULT_STEPS);
+    const RandomSeed seed(20261);
     mRandom.seed(seed);
-    qInfo("seed %u", seed);
+    qInfo("seed %u", quint32(seed));
     QElapsedTimer timer;
     timer.start();
 
@@ -268,7 +262,7 @@ void tst_titlerwindow_library::randomSession()
         if (!held) {
             const qsizetype told = std::min<qsizetype>(mLog.size(), 30);
             QFAIL(qPrintable(QStringLiteral("seed %1, step %2: %3\nthe last steps:\n%4\nthe stack: %5")
-                                 .arg(seed)
+                                 .arg(quint32(seed))
                                  .arg(i)
                                  .arg(mFailure, mLog.mid(mLog.size() - told).join('\n'), mModel.stack())));
         }
@@ -276,7 +270,7 @@ void tst_titlerwindow_library::randomSession()
     QVERIFY2(closeAndReopen() && verify() && verifyFiles(true) && verifyNotices(), qPrintable(mFailure));
     mWindow->closeTitlerWindow();
     QVERIFY(mComparedPictures > 0);
-    qInfo("seed %u: %d steps, %d titles, %d dialogs, %d pictures compared, %lld ms", seed, steps,
+    qInfo("seed %u: %d steps, %d titles, %d dialogs, %d pictures compared, %lld ms", quint32(seed), steps,
           int(mModel.titles.size()), mDialogs, mComparedPictures, static_cast<long long>(timer.elapsed()));
 }
 

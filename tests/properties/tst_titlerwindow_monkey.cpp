@@ -11,6 +11,7 @@
 #include "WindowFingers.h"
 #include "messaging/services/ITitler.h"
 #include "tests/app/Siblings.h"
+#include "tests/support/RandomSeed.h"
 #include "touchui/CustomTreeDelegete.h"
 
 #include <QElapsedTimer>
@@ -167,8 +168,8 @@ private:
 
 void tst_titlerwindow_monkey::initTestCase()
 {
-    mSeed = quint32(MonkeyGround::number("TITLER_SEED", DefaultSeed));
-    mTouches = MonkeyGround::number("TITLER_TOUCHES", DefaultTouches);
+    mSeed = RandomSeed(DefaultSeed);
+    mTouches = runLength("TITLER_TOUCHES", DefaultTouches);
     qInfo("seed %u, %d touches", mSeed, mTouches);
     MonkeyGround::showErrorsOnly();
     QLoggingCategory::setFilterRules(QStringLiteral("*.debug=false"));

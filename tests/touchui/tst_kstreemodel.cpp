@@ -1,6 +1,7 @@
 // The model of the touch tree: attributes, children made on demand, rows, columns and orders.
 #include "TreeFixture.h"
 
+#include "tests/support/RandomSeed.h"
 #include "touchui/KSModelTreeDataItem.h"
 #include "touchui/KSTreeModel.h"
 #include "touchui/KSTreeModelDefaultSortHelper.h"
@@ -591,7 +592,8 @@ void tst_kstreemodel::clearsAttributesOfAll()
 
 void tst_kstreemodel::randomOperations()
 {
-    QRandomGenerator random(20240711);
+    const RandomSeed seed(20240711);
+    QRandomGenerator random(seed);
     TreeSource source;
     source.fill(8, 6);
     KSTreeModel model(&source, 3);
