@@ -1,8 +1,8 @@
 // The context of a request: what is remembered, what is answered, and in which order.
-#include "RecordingCallBack.h"
 #include "app/EditContextController.h"
 #include "document/ArchiveController.h"
 #include "document/ArchiveOrder.h"
+#include "tests/fakes/FakeTitlerCallBack.h"
 
 #include <QSignalSpy>
 #include <QTemporaryDir>
@@ -36,7 +36,7 @@ private Q_SLOTS:
     void editWithoutPathEmitsNothing()
     {
         Answers callBack;
-        context->resultCallBack(new RecordingCallBack(callBack));
+        context->resultCallBack(new FakeTitlerCallBack(callBack));
         context->showTitlerCreate(1);
         QSignalSpy spy(context, &EditContextController::signalShowTitlerParameter);
         context->showTitlerEdit({2, L""});
@@ -57,7 +57,7 @@ private Q_SLOTS:
         context->showTitlerCreate(1);
         QVERIFY(!context->isCreateNew());
         Answers callBack;
-        context->resultCallBack(new RecordingCallBack(callBack));
+        context->resultCallBack(new FakeTitlerCallBack(callBack));
         QVERIFY(context->isCreateNew());
         context->setITitlerNoCallBack();
         QVERIFY(!context->isCreateNew());
@@ -68,7 +68,7 @@ private Q_SLOTS:
         Answers callBack;
         context->insertFilePath(L"/a.xml");
         QVERIFY(!context->isMainNeedMsg());
-        context->resultCallBack(new RecordingCallBack(callBack));
+        context->resultCallBack(new FakeTitlerCallBack(callBack));
         QVERIFY(context->isMainNeedMsg());
         context->deleteFilePath(L"/a.xml");
         QVERIFY(!context->isMainNeedMsg());
@@ -80,7 +80,7 @@ private Q_SLOTS:
     void aFileIsListedOnce()
     {
         Answers callBack;
-        context->resultCallBack(new RecordingCallBack(callBack));
+        context->resultCallBack(new FakeTitlerCallBack(callBack));
         context->showTitlerCreate(1);
         context->insertFilePath(L"/f/a.xml");
         context->insertFilePath(L"/f/a.xml");
@@ -91,7 +91,7 @@ private Q_SLOTS:
     void nothingMadeIsAnsweredWithNothing()
     {
         Answers callBack;
-        context->resultCallBack(new RecordingCallBack(callBack));
+        context->resultCallBack(new FakeTitlerCallBack(callBack));
         context->showTitlerCreate(9);
         context->sentITitlerCallBack(L"/f");
         QCOMPARE(callBack.calls, 1);
@@ -135,7 +135,7 @@ private:
     QStringList sendMade(const QString& folder, const QStringList& names)
     {
         Answers callBack;
-        context->resultCallBack(new RecordingCallBack(callBack));
+        context->resultCallBack(new FakeTitlerCallBack(callBack));
         context->showTitlerCreate(3);
         for (const QString& name : names)
             context->insertFilePath(name.toStdWString());

@@ -14,6 +14,7 @@
 #include "messaging/services/ServiceFamilies.h"
 #include "messaging/services/ServiceTable.h"
 #include "messaging/services/TitlerAdapter.h"
+#include "tests/fakes/FakeTitler.h"
 #include "tests/messaging/TestPorts.h"
 
 #include <QJsonArray>
@@ -36,7 +37,7 @@ QString say(const std::wstring& text)
 // A titler without windows: it listens, registers at the services it is told to, and writes down what it is
 // told.
 class SmallTitler : public PTC::InstanceFactory,
-                    public ITitler,
+                    public FakeTitler,
                     public IAPPEventFilterCallBack,
                     public IAPPEventFilterNotify,
                     public IMessageCenterCallBack,
@@ -93,19 +94,6 @@ public:
         return proxy;
     }
 
-    void registerCallBack(ITitlerCallBack* target) override
-    {
-        callBack.reset(target);
-        calls.append("registerCallBack");
-    }
-    void showTitlerCreate(_CALL_TITLER_TYPE type) override { calls.append(QString("create %1").arg(type)); }
-    void showTitlerEdit(_SHOW_TITLER_PARAMTER p) override
-    {
-        calls.append(QString("edit %1 %2").arg(p.type).arg(say(p.path)));
-    }
-    void showDialogMaskWidget(bool show) override { calls.append(QString("dialog %1").arg(show)); }
-    void showMessageMaskWidget(bool show) override { calls.append(QString("message %1").arg(show)); }
-
     void setClientID(int id) override { calls.append(QString("client id %1").arg(id > 0)); }
     void getClientID(int id) override { calls.append(QString("client id %1").arg(id > 0)); }
     void postAPPEventFilterNotify(APPEventDefine::_tagAPPEvent e) override
@@ -151,8 +139,6 @@ public:
         calls.append(QString("module %1").arg(p.model));
     }
 
-    QStringList calls;
-    std::unique_ptr<ITitlerCallBack> callBack;
     bool connected = true;
 
 private:

@@ -7,11 +7,12 @@
 #include "canvas/CaretGeometry.h"
 #include "canvas/GraphicsPixmap.h"
 #include "canvas/GraphicsView.h"
-#include "canvas/ICanvasHost.h"
 #include "canvas/IInputLanguageSource.h"
-#include "canvas/MessageBoxController.h"
 #include "document/Archive.h"
 #include "document/TitleParser.h"
+#include "tests/fakes/FakeCanvasHost.h"
+#include "tests/fakes/FakeMessageBoxController.h"
+#include "tests/fakes/FakeThumbnailRender.h"
 #include "touchui/KSSoftKeyboardCursorSettingEvent.h"
 
 #include <QAction>
@@ -26,60 +27,14 @@
 #include <QUndoStack>
 #include <cmath>
 
-class FakeMessages : public MessageBoxController
-{
-public:
-    void setFactory(TitlerToolFactory*) override {}
-    void postMessage(MessageDef::Message_ID id) override { posted.append({int(id), QString()}); }
-    void postMessage(MessageDef::Message_ID id, QString text) override { posted.append({int(id), text}); }
-    void postMessage(MessageDef::Message_ID id, MessageDefine::_emBoxType, QString text) override
-    {
-        posted.append({int(id), text});
-    }
-    void setMessageMainWindow(QWidget*) override {}
-    bool GetTitlerIsTop() override { return true; }
-    QMap<QString, QString> getMapData() override { return {}; }
-    void closeMessage(MessageDefine::_emCloseType) override {}
-
-    QList<QPair<int, QString>> posted;
-};
-
-inline FakeMessages* messages = nullptr;
-
-class FakeHost : public ICanvasHost
-{
-public:
-    bool windowIsVisible() const override { return visible; }
-    bool visible = false;
-};
-
-struct RenderLog {
-    int fast = 0;
-    int slow = 0;
-    bool finished = true;
-    IThumbnailRender* render = nullptr;
-};
-
-class FakeRender : public IThumbnailRender
-{
-public:
-    explicit FakeRender(RenderLog& log) : m_log(log) { m_log.render = this; }
-    void makeThumbnail(const Archive* archive, bool bigSize) override
-    {
-        if (archive)
-            ++(bigSize ? m_log.slow : m_log.fast);
-    }
-    bool makePictureThreadIsFinished() override { return m_log.finished; }
-
-private:
-    RenderLog& m_log;
-};
+inline FakeMessageBoxController* messages = nullptr;
 
 // A canvas with its view and an undo stack, as in the window.
 class Canvas
 {
 public:
-    Canvas() : scene(std::make_unique<CanvasScene>(std::make_unique<FakeRender>(log))), view(scene.get())
+    Canvas()
+        : scene(std::make_unique<CanvasScene>(std::make_unique<FakeThumbnailRender>(log))), view(scene.get())
     {
         scene->setSceneRect(TextObjectConstants::SCENE_RECT);
         view.setFrameStyle(0);

@@ -57,12 +57,11 @@ private Q_SLOTS:
 void tst_canvasscene::initTestCase()
 {
     qRegisterMetaType<TText*>("TText*");
-    MessageBoxController::setProvider([]() -> MessageBoxController* { return messages; }, []() {});
 }
 
 void tst_canvasscene::init()
 {
-    messages = new FakeMessages;
+    messages = new FakeMessageBoxController;
     InputLanguageFonts::resetLastFonts();
     InputLanguageFonts::mInputLanguage = 2;
     InputLanguageFonts::IS_CN_MODULE = false;
@@ -145,7 +144,7 @@ void tst_canvasscene::titleWithoutTexts()
 void tst_canvasscene::missingFontWhileHidden()
 {
     Canvas canvas;
-    FakeHost host;
+    FakeCanvasHost host;
     ICanvasHost::setInstance(&host);
     QSignalSpy later(canvas.scene.get(), &CanvasScene::signalHasMessageToShowInformation);
     canvas.open({makeRecord("one", 1, "No Such Family")});
@@ -158,7 +157,7 @@ void tst_canvasscene::missingFontWhileHidden()
 void tst_canvasscene::missingFontWhileVisible()
 {
     Canvas canvas;
-    FakeHost host;
+    FakeCanvasHost host;
     host.visible = true;
     ICanvasHost::setInstance(&host);
     QSignalSpy later(canvas.scene.get(), &CanvasScene::signalHasMessageToShowInformation);
@@ -180,7 +179,7 @@ void tst_canvasscene::missingFontWithoutMessages()
     delete messages;
     messages = nullptr;
     Canvas canvas;
-    FakeHost host;
+    FakeCanvasHost host;
     host.visible = true;
     ICanvasHost::setInstance(&host);
     canvas.open({makeRecord("one", 1, "No Such Family")});

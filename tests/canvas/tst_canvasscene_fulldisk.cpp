@@ -1,6 +1,6 @@
 // What becomes of an edit that the disk refuses.
-#include "../support/FullDisk.h"
 #include "CanvasFixture.h"
+#include "tests/support/FullDisk.h"
 
 #include "support/RefusedWrites.h"
 
@@ -22,7 +22,7 @@ private Q_SLOTS:
     {
         MessageBoxController::setProvider([]() -> MessageBoxController* { return messages; }, [] {});
     }
-    void init() { messages = new FakeMessages; }
+    void init() { messages = new FakeMessageBoxController; }
     void cleanup()
     {
         delete messages;

@@ -43,12 +43,11 @@ private:
 void tst_canvasscene_limits::initTestCase()
 {
     qRegisterMetaType<TText*>("TText*");
-    MessageBoxController::setProvider([]() -> MessageBoxController* { return messages; }, []() {});
 }
 
 void tst_canvasscene_limits::init()
 {
-    messages = new FakeMessages;
+    messages = new FakeMessageBoxController;
     InputLanguageFonts::resetLastFonts();
     InputLanguageFonts::mInputLanguage = 2;
     InputLanguageFonts::IS_CN_MODULE = false;
@@ -384,7 +383,7 @@ void tst_canvasscene_limits::removedFont()
     QCOMPARE(family, QByteArray("DejaVu Sans Mono"));
     Canvas canvas;
     canvas.show();
-    FakeHost host;
+    FakeCanvasHost host;
     host.visible = true;
     ICanvasHost::setInstance(&host);
     canvas.open({makeRecord("ab", 1, family.constData())});

@@ -69,12 +69,11 @@ private:
 void tst_canvasscene_repaint::initTestCase()
 {
     qRegisterMetaType<TText*>("TText*");
-    MessageBoxController::setProvider([]() -> MessageBoxController* { return messages; }, []() {});
 }
 
 void tst_canvasscene_repaint::init()
 {
-    messages = new FakeMessages;
+    messages = new FakeMessageBoxController;
     m_canvas = std::make_unique<Canvas>();
     m_canvas->show();
     TText record = makeRecord(QStringLiteral("Some words"), 1, "KST", 60);

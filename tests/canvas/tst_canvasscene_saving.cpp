@@ -34,12 +34,11 @@ private:
 void tst_canvasscene_saving::initTestCase()
 {
     qRegisterMetaType<TText*>("TText*");
-    MessageBoxController::setProvider([]() -> MessageBoxController* { return messages; }, []() {});
 }
 
 void tst_canvasscene_saving::init()
 {
-    messages = new FakeMessages;
+    messages = new FakeMessageBoxController;
     InputLanguageFonts::resetLastFonts();
     InputLanguageFonts::mInputLanguage = 2;
     InputLanguageFonts::IS_CN_MODULE = false;

@@ -32,12 +32,11 @@ private Q_SLOTS:
 void tst_canvasscene_touch::initTestCase()
 {
     qRegisterMetaType<TText*>("TText*");
-    MessageBoxController::setProvider([]() -> MessageBoxController* { return messages; }, []() {});
 }
 
 void tst_canvasscene_touch::init()
 {
-    messages = new FakeMessages;
+    messages = new FakeMessageBoxController;
     InputLanguageFonts::resetLastFonts();
     InputLanguageFonts::mInputLanguage = 2;
     InputLanguageFonts::IS_CN_MODULE = false;

@@ -1,40 +1,12 @@
 #include "TouchCanvas.h"
 
-#include "messaging/services/ISoftKeyBoardController.h"
 #include "messaging/services/SubCommonDefine.h"
+#include "tests/fakes/FakeSoftKeyBoardController.h"
 #include "touchui/KSInputContext.h"
 
 #include <QClipboard>
 #include <QDir>
 #include <algorithm>
-
-namespace
-{
-
-// Stands for the process that shows the soft keyboard.
-class FakeKeyboard : public ISoftKeyBoardController
-{
-public:
-    void show(SubCommonDefine::tagSoftKeyBoardInitData data) override { shown.append(data); }
-    void close() override { ++closed; }
-    void dummyClose() override { ++dummyClosed; }
-    void simpleClose() override {}
-    void sendKey(SubCommonDefine::tagSoftKeyBoardKeyData key) override { keys.append(key); }
-    void sendLimitInfo(SubCommonDefine::taLimitInfo) override {}
-    void closeLimitBalloon() override {}
-    void registerCallBack(ISoftKeyBoardControllerCallBack*) override {}
-    void showMask() override {}
-    void hideMask() override {}
-    bool isReachable() const override { return alive; }
-
-    QList<SubCommonDefine::tagSoftKeyBoardInitData> shown;
-    QList<SubCommonDefine::tagSoftKeyBoardKeyData> keys;
-    int closed = 0;
-    int dummyClosed = 0;
-    bool alive = true;
-};
-
-} // namespace
 
 // The soft keyboard of the appliance and the text objects of a canvas, through the application's input
 // context: what is typed, where the cursor goes, and how editing ends.
@@ -87,14 +59,13 @@ private:
 
     QPointingDevice* m_device = nullptr;
     KSInputContext* m_context = nullptr;
-    std::unique_ptr<FakeKeyboard> m_keyboard;
+    std::unique_ptr<FakeSoftKeyBoardController> m_keyboard;
 };
 
 void tst_scenekeyboard::initTestCase()
 {
     qRegisterMetaType<TText*>("TText*");
     qApp->setObjectName(QStringLiteral("Titler"));
-    MessageBoxController::setProvider([]() -> MessageBoxController* { return messages; }, []() {});
     m_device = QTest::createTouchDevice();
     m_device->setParent(this);
     m_context = KSInputContext::instance();
@@ -103,8 +74,8 @@ void tst_scenekeyboard::initTestCase()
 
 void tst_scenekeyboard::init()
 {
-    messages = new FakeMessages;
-    m_keyboard = std::make_unique<FakeKeyboard>();
+    messages = new FakeMessageBoxController;
+    m_keyboard = std::make_unique<FakeSoftKeyBoardController>();
     m_context->setKeyBoardController(m_keyboard.get());
     InputLanguageFonts::resetLastFonts();
     InputLanguageFonts::mInputLanguage = 2;
@@ -266,9 +237,9 @@ void tst_scenekeyboard::tapOnEmptyCanvasClosesTheKeyboard()
     // On the object it stays.
     canvas.touchTap(canvas.caretIn(*canvas.text(1), 1));
     QVERIFY(!KSInputContext::isSoftKeyboardClosed());
-    const int before = m_keyboard->dummyClosed;
+    const qsizetype before = m_keyboard->calls.count("dummyClose");
     canvas.touchTap(QPoint(80, 600));
-    QCOMPARE(m_keyboard->dummyClosed, before + 1);
+    QCOMPARE(m_keyboard->calls.count("dummyClose"), before + 1);
     QVERIFY(KSInputContext::isSoftKeyboardClosed());
 }
 
@@ -512,19 +483,19 @@ void tst_scenekeyboard::changeOfTheWholeEndsEditing()
     canvas.quickTap(canvas.caretIn(*item, 2));
     canvas.quickTap(canvas.caretIn(*item, 2));
     QVERIFY(!KSInputContext::isSoftKeyboardClosed());
-    const int before = m_keyboard->dummyClosed;
+    const qsizetype before = m_keyboard->calls.count("dummyClose");
     TText source = makeSource(makeStyle("M"), 4);
     source.setTextAlign(1);
     source.setShadowStyle(1);
     canvas.scene->slotChangeObjectTextStyle(&source, property, 1);
     QCOMPARE(item->textInteractionFlags(), Qt::NoTextInteraction);
-    QCOMPARE(m_keyboard->dummyClosed, before + 1);
+    QCOMPARE(m_keyboard->calls.count("dummyClose"), before + 1);
     QVERIFY(KSInputContext::isSoftKeyboardClosed());
     // A selected object has no keyboard to put away.
     source.setTextAlign(0);
     source.setShadowStyle(2);
     canvas.scene->slotChangeObjectTextStyle(&source, property, 1);
-    QCOMPARE(m_keyboard->dummyClosed, before + 1);
+    QCOMPARE(m_keyboard->calls.count("dummyClose"), before + 1);
     QCOMPARE(canvas.stack.count(), 2);
 }
 

@@ -52,12 +52,11 @@ private:
 void tst_styledispatch::initTestCase()
 {
     qRegisterMetaType<TText*>("TText*");
-    MessageBoxController::setProvider([]() -> MessageBoxController* { return messages; }, []() {});
 }
 
 void tst_styledispatch::init()
 {
-    messages = new FakeMessages;
+    messages = new FakeMessageBoxController;
     InputLanguageFonts::resetLastFonts();
     InputLanguageFonts::mInputLanguage = 2;
     InputLanguageFonts::IS_CN_MODULE = false;

@@ -1,5 +1,5 @@
 #include "CanvasTestTools.h"
-#include "FakeTextObject.h"
+#include "tests/fakes/FakeTextObject.h"
 
 #include "canvas/TextStyleEditor.h"
 #include "canvas/TouchTextEditor.h"

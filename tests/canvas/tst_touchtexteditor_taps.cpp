@@ -44,14 +44,13 @@ private:
 void tst_touchtexteditor_taps::initTestCase()
 {
     qRegisterMetaType<TText*>("TText*");
-    MessageBoxController::setProvider([]() -> MessageBoxController* { return messages; }, []() {});
     m_device = QTest::createTouchDevice();
     m_device->setParent(this);
 }
 
 void tst_touchtexteditor_taps::init()
 {
-    messages = new FakeMessages;
+    messages = new FakeMessageBoxController;
     InputLanguageFonts::resetLastFonts();
     InputLanguageFonts::mInputLanguage = 2;
     InputLanguageFonts::IS_CN_MODULE = false;

@@ -1,18 +1,18 @@
 // Titles on disk: the archive manager, its facade for the widgets, and the remembered settings.
-#include "../support/LogFixture.h"
-#include "../support/SettledFolder.h"
 #include "document/Archive.h"
 #include "document/ArchiveController.h"
 #include "document/ArchiveManager.h"
 #include "document/ArchiveOrder.h"
 #include "document/CanvasController.h"
 #include "document/FontStyle.h"
-#include "document/ITitleChangeReporter.h"
 #include "document/LastSettingParser.h"
 #include "document/SettingManager.h"
 #include "document/TText.h"
 #include "support/FileSyncQueue.h"
 #include "support/IPathManagerEx.h"
+#include "tests/fakes/FakeTitleChangeReporter.h"
+#include "tests/support/LogFixture.h"
+#include "tests/support/SettledFolder.h"
 
 #include <QDir>
 #include <QFile>
@@ -21,25 +21,6 @@
 #include <filesystem>
 #include <fstream>
 #include <memory>
-
-namespace
-{
-
-class Reporter : public ITitleChangeReporter
-{
-public:
-    Reporter() { setInstance(this); }
-    ~Reporter() override { setInstance(nullptr); }
-
-    void changeTitlerStatus(FileManagerDefine::emTITLECHANGE_TYPE type, QString path) override
-    {
-        reports.append({int(type), path});
-    }
-
-    QList<std::pair<int, QString>> reports;
-};
-
-} // namespace
 
 class tst_archivemanager : public QObject
 {
@@ -602,7 +583,7 @@ private Q_SLOTS:
 
     void uselessTitlesAreDeleted()
     {
-        Reporter reporter;
+        FakeTitleChangeReporter reporter;
         ArchiveController controller;
         controller.deleteUnusefulArchives(mFolder + "/none");
         for (const char* name : {"a", "b", "c"}) {
@@ -612,7 +593,7 @@ private Q_SLOTS:
         setOrder({"b.xml", "a.xml"});
         controller.deleteUnusefulArchives(mFolder);
         QCOMPARE(entries(), QStringList({".order.xml", "a.xml", "a_1920.png", "b.xml", "b_1920.png"}));
-        QCOMPARE(reporter.reports, (QList<std::pair<int, QString>>{{2, file("c.xml")}}));
+        QCOMPARE(reporter.takePaths(), (QList<std::pair<int, QString>>{{2, file("c.xml")}}));
         // Two mismatches that balance each other out go unnoticed.
         setOrder({"b.xml", "gone.xml"});
         controller.deleteUnusefulArchives(mFolder);
@@ -620,7 +601,7 @@ private Q_SLOTS:
         setOrder({});
         controller.deleteUnusefulArchives(mFolder);
         QCOMPARE(entries(), QStringList{".order.xml"});
-        QCOMPARE(reporter.reports.size(), 3);
+        QCOMPARE(reporter.take().size(), 2);
     }
 
     void deletionWithoutAListener()

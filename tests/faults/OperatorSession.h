@@ -1,8 +1,8 @@
 #pragma once
 
-#include "../app/Siblings.h"
 #include "Journal.h"
 #include "library/ArchiveAction.h"
+#include "tests/app/Siblings.h"
 
 #include <QObject>
 #include <functional>

@@ -7,11 +7,11 @@
 //   titler_fault_session play-healed DATA  the same with a disk that is well again before each Close
 //   titler_fault_session look DATA         what the next process finds
 //   titler_fault_session soak DATA COUNT   opens, edits and closes so many times, reporting the memory in use
-#include "../library/TemplateFixture.h"
 #include "FaultShim.h"
 #include "OperatorSession.h"
 #include "support/FileSyncQueue.h"
 #include "support/LeftoverSweep.h"
+#include "tests/library/TemplateFixture.h"
 #include "touchui/KSInputContext.h"
 
 #include <QApplication>

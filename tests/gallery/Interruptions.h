@@ -4,7 +4,7 @@
 #include "app/APPEventFilter.h"
 #include "gallery/Fingers.h"
 #include "gallery/Monkey.h"
-#include "tests/touchui/ManualClock.h"
+#include "tests/fakes/ManualClock.h"
 #include "touchui/KSBaseItemWidget.h"
 #include "touchui/KSEventDefaultMutexLockObject.h"
 #include "touchui/KSEventProcessLockObject.h"

@@ -41,7 +41,7 @@ public:
     void open()
     {
         touch = std::make_unique<TouchFixture>();
-        service = std::make_unique<FakeService>();
+        service = std::make_unique<FakeSoftKeyBoardController>();
         input()->setKeyBoardController(service.get());
         window = std::make_unique<QWidget>();
         window->resize(1920, 1080);
@@ -197,12 +197,12 @@ public:
     }
 
     LibraryFixture files;
-    MessageRecorder messages;
-    FolderReportRecorder reports;
-    TitleReportRecorder titles;
-    EditContextRecorder context;
+    FakeMessageBoxController messages;
+    FakeTitlerFolderReporter reports;
+    FakeTitleChangeReporter titles;
+    FakeEditContext context;
     std::unique_ptr<TouchFixture> touch;
-    std::unique_ptr<FakeService> service;
+    std::unique_ptr<FakeSoftKeyBoardController> service;
     std::unique_ptr<QWidget> window;
     std::unique_ptr<FolderPicker> picker;
     std::unique_ptr<QAbstractItemModelTester> tester;

@@ -1,23 +1,20 @@
-// A data path for one test program, with title folders and with recorders for the reports of the title
-// library.
+// A data path for one test program, with title folders, and fakes of what the title library reports to.
 #pragma once
 
-#include "canvas/MessageBoxController.h"
 #include "document/Archive.h"
 #include "document/ArchiveController.h"
 #include "document/ArchiveOrder.h"
-#include "document/ITitleChangeReporter.h"
 #include "document/TText.h"
 #include "document/TextStyle.h"
-#include "library/IEditContext.h"
-#include "library/ITitlerFolderReporter.h"
+#include "tests/fakes/FakeEditContext.h"
+#include "tests/fakes/FakeMessageBoxController.h"
+#include "tests/fakes/FakeTitleChangeReporter.h"
+#include "tests/fakes/FakeTitlerFolderReporter.h"
 
 #include <QDir>
 #include <QFile>
 #include <QFileInfo>
 #include <QImage>
-#include <QMutex>
-#include <QMutexLocker>
 #include <QPair>
 #include <QStringList>
 #include <QTemporaryDir>
@@ -146,109 +143,6 @@ public:
 
 private:
     QTemporaryDir mDir;
-};
-
-class TitleReportRecorder : public ITitleChangeReporter
-{
-public:
-    TitleReportRecorder() { setInstance(this); }
-    ~TitleReportRecorder() override { setInstance(nullptr); }
-
-    void changeTitlerStatus(FileManagerDefine::emTITLECHANGE_TYPE type, QString path) override
-    {
-        QMutexLocker lock(&mMutex);
-        mReports.append({static_cast<int>(type), QFileInfo(path).completeBaseName()});
-    }
-    QList<QPair<int, QString>> take()
-    {
-        QMutexLocker lock(&mMutex);
-        return std::exchange(mReports, {});
-    }
-
-private:
-    QMutex mMutex;
-    QList<QPair<int, QString>> mReports;
-};
-
-class EditContextRecorder : public IEditContext
-{
-public:
-    EditContextRecorder() { setInstance(this); }
-    ~EditContextRecorder() override { setInstance(nullptr); }
-
-    bool isCreateNew() override { return createNew; }
-    bool isNewCreateFile(std::wstring fileName) override
-    {
-        return files.contains(QString::fromStdWString(fileName));
-    }
-    void insertFilePath(std::wstring fileName) override { files.append(QString::fromStdWString(fileName)); }
-    void deleteFilePath(std::wstring fileName) override
-    {
-        files.removeAll(QString::fromStdWString(fileName));
-    }
-
-    bool createNew = false;
-    QStringList files;
-};
-
-class FolderReportRecorder : public ITitlerFolderReporter
-{
-public:
-    FolderReportRecorder() { setInstance(this); }
-    ~FolderReportRecorder() override { setInstance(nullptr); }
-
-    void editFolderStartStatus(QString folder) override { note(QStringLiteral("start"), folder); }
-    void editFolderEndStatus(QString folder) override { note(QStringLiteral("end"), folder); }
-    void updateTitlerOrder(QString folder) override { note(QStringLiteral("order"), folder); }
-
-    void renameFolderStartStatus(QString folder) override { note(QStringLiteral("rename"), folder); }
-    void changeTitlerFolderName(QString oldPath, QString newPath) override
-    {
-        mReports.append(QStringLiteral("renamed ") + QFileInfo(oldPath).fileName() + QStringLiteral(" to ") +
-                        QFileInfo(newPath).fileName());
-    }
-
-    QStringList take() { return std::exchange(mReports, {}); }
-
-private:
-    void note(const QString& what, const QString& folder)
-    {
-        mReports.append(what + QLatin1Char(' ') + QFileInfo(folder).fileName());
-    }
-    QStringList mReports;
-};
-
-class MessageRecorder : public MessageBoxController
-{
-public:
-    MessageRecorder()
-    {
-        sRecorder = this;
-        setProvider([]() -> MessageBoxController* { return sRecorder; }, [] {});
-    }
-    ~MessageRecorder() override
-    {
-        sRecorder = nullptr;
-        setProvider(nullptr, nullptr);
-    }
-
-    void setFactory(TitlerToolFactory*) override {}
-    void postMessage(MessageDef::Message_ID id) override { mPosted.append({id, QString()}); }
-    void postMessage(MessageDef::Message_ID id, QString text) override { mPosted.append({id, text}); }
-    void postMessage(MessageDef::Message_ID id, MessageDefine::_emBoxType, QString text) override
-    {
-        mPosted.append({id, text});
-    }
-    void setMessageMainWindow(QWidget*) override {}
-    bool GetTitlerIsTop() override { return true; }
-    QMap<QString, QString> getMapData() override { return {}; }
-    void closeMessage(MessageDefine::_emCloseType) override {}
-
-    QList<QPair<int, QString>> take() { return std::exchange(mPosted, {}); }
-
-private:
-    inline static MessageRecorder* sRecorder = nullptr;
-    QList<QPair<int, QString>> mPosted;
 };
 
 using Reports = QList<QPair<int, QString>>;

@@ -5,7 +5,7 @@
 #include "library/ArchiveItem.h"
 #include "library/ArchiveList.h"
 #include "library/ArchiveMenu.h"
-#include "tests/touchui/ManualClock.h"
+#include "tests/fakes/ManualClock.h"
 #include "tests/touchui/Taps.h"
 #include "touchui/KSAppEventFilter.h"
 #include "touchui/KSMenu.h"

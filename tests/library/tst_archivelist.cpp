@@ -105,9 +105,9 @@ private:
     }
 
     LibraryFixture mFixture;
-    EditContextRecorder mContext;
-    FolderReportRecorder mFolders;
-    MessageRecorder mMessages;
+    FakeEditContext mContext;
+    FakeTitlerFolderReporter mFolders;
+    FakeMessageBoxController mMessages;
     std::unique_ptr<QLabel> mLabel;
     std::unique_ptr<ArchiveList> mList;
     QUndoStack mStack;

@@ -1,5 +1,4 @@
 // The list, the canvas and the pictures together, wired as the window wires them.
-#include "HoldingReporter.h"
 #include "LibraryFixture.h"
 
 #include "canvas/CanvasScene.h"
@@ -208,7 +207,7 @@ void tst_archivelist_canvas::deletedTitleLeavesTheCanvas()
 
 void tst_archivelist_canvas::deletedTitleLeavesNoPictures()
 {
-    HoldingReporter reporter;
+    FakeTitleChangeReporter reporter(FakeTitleChangeReporter::Pictures::Hold);
     const QString folder = mFixture.makeFolder(QStringLiteral("trace"));
     mList->refreshArchiveList(folder);
     createTitle(QStringLiteral("Kept"));
@@ -234,7 +233,7 @@ void tst_archivelist_canvas::picturesFollowTheirFolder()
     const QString after = before + QStringLiteral(" and after");
     QDir(after).removeRecursively();
     {
-        HoldingReporter reporter;
+        FakeTitleChangeReporter reporter(FakeTitleChangeReporter::Pictures::Hold);
         mList->refreshArchiveList(before);
         createTitle(QStringLiteral("One"));
         mScene->slotMakeSceneThumnail();

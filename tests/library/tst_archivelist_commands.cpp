@@ -1,6 +1,6 @@
 // Create, paste, delete, move and focus through an undo stack: list, order file, request and reports.
-#include "../support/SettledFolder.h"
 #include "LibraryFixture.h"
+#include "tests/support/SettledFolder.h"
 
 #include "library/ArchiveItem.h"
 #include "library/ArchiveList.h"
@@ -9,33 +9,12 @@
 #include "library/DeleteArchiveCommand.h"
 #include "library/FocusArchiveCommand.h"
 #include "library/MoveArchiveCommand.h"
-#include "touchui/ITitlerAPPEventFilterController.h"
+#include "tests/fakes/FakeTitlerAPPEventFilterController.h"
 
 #include <QLabel>
 #include <QSignalSpy>
 #include <QTest>
 #include <QUndoStack>
-
-namespace
-{
-
-// The way of the locks to the other processes.
-class AppEventRecorder : public ITitlerAPPEventFilterController
-{
-public:
-    AppEventRecorder() { setInstance(this); }
-
-    void initialize(TitlerToolFactory*) override {}
-    void sendAPPEvent(APPEventDefine::LOCKTYPE type, bool on) override { mSent.append({int(type), on}); }
-    void informRestoreOriginal(APPEventDefine::EventRevicer) override {}
-
-    QList<QPair<int, bool>> take() { return std::exchange(mSent, {}); }
-
-private:
-    QList<QPair<int, bool>> mSent;
-};
-
-} // namespace
 
 class tst_archivelist_commands : public QObject
 {
@@ -95,9 +74,9 @@ private:
     void tap(int index) { QTest::mouseClick(item(index), Qt::LeftButton, Qt::NoModifier, QPoint(20, 20)); }
 
     LibraryFixture mFixture;
-    TitleReportRecorder mReports;
-    EditContextRecorder mContext;
-    FolderReportRecorder mFolders;
+    FakeTitleChangeReporter mReports;
+    FakeEditContext mContext;
+    FakeTitlerFolderReporter mFolders;
     std::unique_ptr<QUndoStack> mStack;
     std::unique_ptr<QLabel> mLabel;
     std::unique_ptr<ArchiveList> mList;
@@ -360,7 +339,7 @@ void tst_archivelist_commands::moveAndBack()
 
 void tst_archivelist_commands::undoOfAMoveEndsTheOperation()
 {
-    AppEventRecorder events;
+    FakeTitlerAPPEventFilterController events;
     open(QStringLiteral("move border"));
     ArchiveItem* moved = item(1);
     mList->removeWidgetItem(moved);

@@ -1,6 +1,6 @@
 // Folders as other programs, full disks and torn writes leave them: what the title list makes of them.
-#include "../support/FullDisk.h"
 #include "TitleListFixture.h"
+#include "tests/support/FullDisk.h"
 
 #include <QFileDevice>
 #include <QGraphicsPixmapItem>
@@ -96,10 +96,10 @@ private:
     }
 
     LibraryFixture mFixture;
-    EditContextRecorder mContext;
-    FolderReportRecorder mFolders;
-    TitleReportRecorder mReports;
-    MessageRecorder mMessages;
+    FakeEditContext mContext;
+    FakeTitlerFolderReporter mFolders;
+    FakeTitleChangeReporter mReports;
+    FakeMessageBoxController mMessages;
     QPointingDevice* mDevice = nullptr;
     std::unique_ptr<TitleListFixture> m;
 };

@@ -1,8 +1,8 @@
 // What the title list keeps and tells when the disk takes no more bytes, and what it makes of folders whose
 // order is missing or damaged.
-#include "../support/FullDisk.h"
-#include "../support/SettledFolder.h"
 #include "TitleListFixture.h"
+#include "tests/support/FullDisk.h"
+#include "tests/support/SettledFolder.h"
 
 #include "document/FolderOrder.h"
 #include "support/RefusedWrites.h"
@@ -77,7 +77,7 @@ private:
     }
 
     LibraryFixture mFixture;
-    MessageRecorder mMessages;
+    FakeMessageBoxController mMessages;
     QPointingDevice* mDevice = nullptr;
     std::unique_ptr<TitleListFixture> m;
 };

@@ -132,10 +132,10 @@ private:
     }
 
     LibraryFixture mFixture;
-    EditContextRecorder mContext;
-    FolderReportRecorder mFolders;
-    TitleReportRecorder mReports;
-    MessageRecorder mMessages;
+    FakeEditContext mContext;
+    FakeTitlerFolderReporter mFolders;
+    FakeTitleChangeReporter mReports;
+    FakeMessageBoxController mMessages;
     QPointingDevice* mDevice = nullptr;
     QString mPattern;
     int mFolderNumber = 0;

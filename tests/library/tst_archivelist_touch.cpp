@@ -86,10 +86,10 @@ private:
     QString templateRoot() const { return QDir::cleanPath(mFixture.titleRoot() + "/../usertemplates"); }
 
     LibraryFixture mFixture;
-    EditContextRecorder mContext;
-    FolderReportRecorder mFolders;
-    TitleReportRecorder mReports;
-    MessageRecorder mMessages;
+    FakeEditContext mContext;
+    FakeTitlerFolderReporter mFolders;
+    FakeTitleChangeReporter mReports;
+    FakeMessageBoxController mMessages;
     QPointingDevice* mDevice = nullptr;
     std::unique_ptr<TitleListFixture> m;
 };

@@ -2,8 +2,8 @@
 // reports and the texts of its messages.
 #include "TitleListFixture.h"
 
+#include "tests/fakes/FakeTitlerAPPEventFilterController.h"
 #include "tests/support/LogFixture.h"
-#include "touchui/ITitlerAPPEventFilterController.h"
 
 #include <QSignalSpy>
 #include <QTemporaryDir>
@@ -17,37 +17,6 @@ using Events = QList<QPair<int, bool>>;
 
 namespace
 {
-
-// Stands in for the way to the sibling processes.
-class EventRecorder : public ITitlerAPPEventFilterController
-{
-public:
-    EventRecorder() { setInstance(this); }
-    ~EventRecorder() override { setInstance(nullptr); }
-
-    void initialize(TitlerToolFactory*) override {}
-    void sendAPPEvent(APPEventDefine::LOCKTYPE type, bool on) override { mSent.append({type, on}); }
-    void informRestoreOriginal(APPEventDefine::EventRevicer) override {}
-
-    Events take() { return std::exchange(mSent, {}); }
-
-private:
-    Events mSent;
-};
-
-class PathRecorder : public ITitleChangeReporter
-{
-public:
-    PathRecorder() { setInstance(this); }
-    ~PathRecorder() override { setInstance(nullptr); }
-
-    void changeTitlerStatus(FileManagerDefine::emTITLECHANGE_TYPE type, QString path) override
-    {
-        reports.append({static_cast<int>(type), path});
-    }
-
-    Reports reports;
-};
 
 Names templates(int first, int last)
 {
@@ -100,9 +69,9 @@ private:
 
     LibraryFixture mFixture;
     LogFixture mLog;
-    MessageRecorder mMessages;
+    FakeMessageBoxController mMessages;
     QPointingDevice* mDevice = nullptr;
-    std::unique_ptr<EventRecorder> mEvents;
+    std::unique_ptr<FakeTitlerAPPEventFilterController> mEvents;
     std::unique_ptr<TitleListFixture> m;
 };
 
@@ -120,7 +89,7 @@ void tst_archivemenu::init()
 {
     QDir(templateRoot()).removeRecursively();
     QVERIFY(QDir().mkpath(templateRoot()));
-    mEvents = std::make_unique<EventRecorder>();
+    mEvents = std::make_unique<FakeTitlerAPPEventFilterController>();
     m = std::make_unique<TitleListFixture>(mDevice);
     mMessages.take();
 }
@@ -252,10 +221,10 @@ void tst_archivemenu::savingTheShownTitleSelectsNothing()
 
 void tst_archivemenu::templateIsReportedWithItsFolder()
 {
-    PathRecorder recorder;
+    FakeTitleChangeReporter reporter;
     openFolder(QStringLiteral("reported"), 2);
     m->holdAndChoose(1, ArchiveAction::ACTION_ADD_USER);
-    QCOMPARE(recorder.reports, (Reports{{5, templateRoot() + QStringLiteral("/UserTemplate_001")}}));
+    QCOMPARE(reporter.takePaths(), (Reports{{5, templateRoot() + QStringLiteral("/UserTemplate_001")}}));
 }
 
 void tst_archivemenu::fullTemplateListTellsTheFreeName_data()

@@ -1,7 +1,7 @@
 // The folder picker without its dialog: which names are taken, what is done on the disk, and what the tree is
 // filled with.
-#include "../support/SettledFolder.h"
 #include "LibraryFixture.h"
+#include "tests/support/SettledFolder.h"
 
 #include "library/EditorRegExpValidator.h"
 #include "library/FolderEditor.h"

@@ -2,47 +2,12 @@
 // header sorts. Which check comes first when a folder is opened in the editor. What the operator, the other
 // processes and the operation log are told.
 #include "FolderPickerFixture.h"
+#include "tests/fakes/ManualClock.h"
 #include "tests/support/LogFixture.h"
-#include "tests/touchui/ManualClock.h"
 #include "touchui/KSEventMutexLockObject.h"
 
 #include <QHeaderView>
 #include <QLabel>
-
-// Keeps what the folder picker reports, path for path.
-class PathRecorder : public ITitlerFolderReporter, public ITitleChangeReporter
-{
-public:
-    PathRecorder()
-    {
-        ITitlerFolderReporter::setInstance(this);
-        ITitleChangeReporter::setInstance(this);
-    }
-    ~PathRecorder() override
-    {
-        ITitlerFolderReporter::setInstance(mFolders);
-        ITitleChangeReporter::setInstance(mTitles);
-    }
-    void editFolderStartStatus(QString folder) override { told.append("edit " + folder); }
-    void editFolderEndStatus(QString folder) override { told.append("end " + folder); }
-    void updateTitlerOrder(QString folder) override { told.append("order " + folder); }
-    void renameFolderStartStatus(QString folder) override { told.append("rename " + folder); }
-    void changeTitlerFolderName(QString before, QString after) override
-    {
-        told.append(before + " becomes " + after);
-    }
-    void changeTitlerStatus(FileManagerDefine::emTITLECHANGE_TYPE type, QString path) override
-    {
-        told.append(QString::number(type) + QLatin1Char(' ') + path);
-    }
-    QStringList take() { return std::exchange(told, {}); }
-
-private:
-    QStringList told;
-    // Who is told before and after this.
-    ITitlerFolderReporter* mFolders = ITitlerFolderReporter::instance();
-    ITitleChangeReporter* mTitles = ITitleChangeReporter::instance();
-};
 
 class tst_folderpicker_taps : public QObject
 {
@@ -126,7 +91,7 @@ private Q_SLOTS:
         f.make("news", {"t1"});
         f.make("sports", {});
         f.open();
-        PathRecorder recorder;
+        takeReports();
         ManualClock clock;
         const std::unique_ptr<KSLockObject> lock(KSEventMutexLockObject::createFactory(nullptr));
         const QPoint news = f.tree()->viewport()->mapTo(f.picker.get(), f.place(f.row("news")));
@@ -135,7 +100,7 @@ private Q_SLOTS:
         f.touch->lift(f.picker.get(), news);
         clock.advance(2000);
         QVERIFY(!f.picker->editor());
-        QCOMPARE(recorder.take(), QStringList());
+        QCOMPARE(takeReports(), QStringList());
         f.touch->filter->unlock();
         f.tap("sports");
         QCOMPARE(f.current(), QStringLiteral("sports"));
@@ -273,21 +238,21 @@ private Q_SLOTS:
 
     void foldersAreToldByTheirPaths()
     {
-        PathRecorder recorder;
+        takeReports();
         f.make("news", {"t1"});
         f.open();
         f.hold("news");
-        QCOMPARE(recorder.take(), QStringList("rename " + f.path("news")));
+        QCOMPARE(takeReports(), QStringList("rename " + f.path("news")));
         f.enter("later");
-        QCOMPARE(recorder.take(), QStringList(f.path("news") + " becomes " + f.path("later")));
+        QCOMPARE(takeReports(), QStringList("renamed " + f.path("news") + " to " + f.path("later")));
         const QString added = QString::number(FileManagerDefine::TITLE_ADDED) + QLatin1Char(' ');
         f.tapButton("newFolderButton");
         f.enter("made");
-        QCOMPARE(recorder.take(), QStringList(added + f.path("made")));
+        QCOMPARE(takeReports(), QStringList(added + f.path("made")));
         f.tap("later");
         f.tapButton("duplicateFolderButton");
         f.enter("copy");
-        QCOMPARE(recorder.take(), QStringList(added + f.path("copy")));
+        QCOMPARE(takeReports(), QStringList(added + f.path("copy")));
     }
 
     // --- What the operation log tells -----------------------------------------------------------------
@@ -386,6 +351,14 @@ private Q_SLOTS:
     }
 
 private:
+    // Returns what the file manager was told since the last call, with full paths.
+    QStringList takeReports()
+    {
+        QStringList lines = f.reports.takePaths();
+        for (const auto& [change, path] : f.titles.takePaths())
+            lines.append(QString::number(change) + QLatin1Char(' ') + path);
+        return lines;
+    }
     // The mark in front of the name.
     void tapMark(const QString& name)
     {

@@ -1,7 +1,6 @@
 // The thread that writes a title's pictures: what it writes, when it counts as finished, what it drops.
-#include "../support/SettledFolder.h"
-#include "HoldingReporter.h"
 #include "LibraryFixture.h"
+#include "tests/support/SettledFolder.h"
 
 #include "library/PictureThread.h"
 
@@ -53,7 +52,7 @@ private:
 
 void tst_picturethread::finishedStates()
 {
-    HoldingReporter reporter;
+    FakeTitleChangeReporter reporter(FakeTitleChangeReporter::Pictures::Hold);
     const auto archive = LibraryFixture::makeRecord(mFixture.makeFolder(QStringLiteral("states")),
                                                     QStringLiteral("t"), QString());
     PictureThread thread;
@@ -80,7 +79,7 @@ void tst_picturethread::refusedJobs()
 
 void tst_picturethread::filesAndSizes()
 {
-    TitleReportRecorder reports;
+    FakeTitleChangeReporter reports;
     const QString folder = mFixture.makeFolder(QStringLiteral("sizes"));
     const auto archive = LibraryFixture::makeRecord(folder, QStringLiteral("t"), QString());
     PictureThread thread;
@@ -119,7 +118,7 @@ void tst_picturethread::transparentParts()
 
 void tst_picturethread::jobQueuedAtTheEndIsNeverWritten()
 {
-    HoldingReporter reporter;
+    FakeTitleChangeReporter reporter(FakeTitleChangeReporter::Pictures::Hold);
     const QString folder = mFixture.makeFolder(QStringLiteral("dropped"));
     const auto first = LibraryFixture::makeRecord(folder, QStringLiteral("first"), QString());
     const auto second = LibraryFixture::makeRecord(folder, QStringLiteral("second"), QString());
@@ -142,7 +141,7 @@ void tst_picturethread::jobQueuedAtTheEndIsNeverWritten()
 
 void tst_picturethread::jobsAreWrittenInOrder()
 {
-    TitleReportRecorder reports;
+    FakeTitleChangeReporter reports;
     const QString folder = mFixture.makeFolder(QStringLiteral("in order"));
     PictureThread thread;
     Reports expected;
@@ -158,7 +157,7 @@ void tst_picturethread::jobsAreWrittenInOrder()
 
 void tst_picturethread::unwritableFolderIsPassedOver()
 {
-    TitleReportRecorder reports;
+    FakeTitleChangeReporter reports;
     const auto archive =
         LibraryFixture::makeRecord(QStringLiteral("/nonexistent/folder"), QStringLiteral("t"), QString());
     PictureThread thread;
@@ -190,7 +189,7 @@ void tst_picturethread::namesOfTitlesAreNoPictures_data()
 void tst_picturethread::namesOfTitlesAreNoPictures()
 {
     QFETCH(bool, isDeletedMeanwhile);
-    HoldingReporter reporter;
+    FakeTitleChangeReporter reporter(FakeTitleChangeReporter::Pictures::Hold);
     const QString folder = mFixture.makeFolder(QStringLiteral("titles"));
     LibraryFixture::fillFolder(folder, {QStringLiteral("t"), QStringLiteral("other")});
     const auto archive = LibraryFixture::makeRecord(folder, QStringLiteral("t"), QString());
@@ -222,7 +221,7 @@ void tst_picturethread::deletedTitleKeepsNoPictures_data()
 void tst_picturethread::deletedTitleKeepsNoPictures()
 {
     QFETCH(bool, isBeingWritten);
-    HoldingReporter reporter;
+    FakeTitleChangeReporter reporter(FakeTitleChangeReporter::Pictures::Hold);
     const QString folder = mFixture.makeFolder(QStringLiteral("deleted"));
     LibraryFixture::fillFolder(folder, {QStringLiteral("gone"), QStringLiteral("kept")});
     const auto gone = LibraryFixture::makeRecord(folder, QStringLiteral("gone"), QString());

@@ -769,8 +769,8 @@ private:
     }
 
     TemplateFixture mFixture;
-    TitleReportRecorder mReports;
-    MessageRecorder mMessages;
+    FakeTitleChangeReporter mReports;
+    FakeMessageBoxController mMessages;
     QPointingDevice* mDevice = [this] {
         QPointingDevice* device = QTest::createTouchDevice();
         device->setParent(this);

@@ -1,7 +1,7 @@
 // What the template picker makes of the file manager's notices about template folders, told in each way a
 // path can be told, and what it writes to the logs.
-#include "../support/LogFixture.h"
 #include "TemplateFixture.h"
+#include "tests/support/LogFixture.h"
 
 #include "library/TemplateItem.h"
 #include "library/TemplatePicker.h"
@@ -68,8 +68,8 @@ private:
     QString told(QString path) const { return path.replace(QLatin1String("%1"), mFixture.userRoot()); }
 
     TemplateFixture mFixture;
-    TitleReportRecorder mReports;
-    MessageRecorder mMessages;
+    FakeTitleChangeReporter mReports;
+    FakeMessageBoxController mMessages;
     LogFixture mLog;
     std::unique_ptr<TemplatePicker> mPicker;
 };

@@ -1,7 +1,7 @@
 // The pictures of a title: sizes, places, transparency and when each stage runs.
-#include "../support/FullDisk.h"
-#include "../support/LogFixture.h"
 #include "LibraryFixture.h"
+#include "tests/support/FullDisk.h"
+#include "tests/support/LogFixture.h"
 
 #include "document/TShadow.h"
 #include "library/ThumbnailRender.h"
@@ -239,7 +239,7 @@ void tst_thumbnailrender::hugeBackgroundGivesPicturesOfTheUsualSize()
 
 void tst_thumbnailrender::slowStageWritesFourFiles()
 {
-    TitleReportRecorder reports;
+    FakeTitleChangeReporter reports;
     const QString folder = mFixture.makeFolder(QStringLiteral("slow"));
     const auto archive = LibraryFixture::makeRecord(folder, QStringLiteral("t"), QStringLiteral("Slow"));
     archive->setBgResource("bg.png");
@@ -318,7 +318,7 @@ void tst_thumbnailrender::slowStageDrawsWhileTheEventsGoOn()
 {
     const QString folder = mFixture.makeFolder(QStringLiteral("events"));
     paint(folder + QStringLiteral("/bg.png"), QSize(1920, 1080), QColor(20, 90, 40));
-    TitleReportRecorder reports;
+    FakeTitleChangeReporter reports;
     ThumbnailRender render;
     Reports wanted;
     for (const QString name : {"a", "b", "c"}) {

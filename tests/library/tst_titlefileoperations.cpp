@@ -1,6 +1,6 @@
 // Names and files of titles that are made from a template or from a copy.
-#include "../support/SettledFolder.h"
 #include "LibraryFixture.h"
+#include "tests/support/SettledFolder.h"
 
 #include "library/TitleFileOperations.h"
 #include "library/TitlerUtility.h"

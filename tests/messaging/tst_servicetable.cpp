@@ -17,7 +17,9 @@
 #include "messaging/services/ServiceTable.h"
 #include "messaging/services/TitlerAdapter.h"
 #include "messaging/services/TitlerParams.h"
-#include "tests/messaging/LoopSender.h"
+#include "tests/fakes/FakeTitler.h"
+#include "tests/fakes/FakeTitlerCallBack.h"
+#include "tests/fakes/LoopSender.h"
 #include "tests/support/RandomSeed.h"
 
 #include <QJsonDocument>
@@ -150,43 +152,6 @@ private:
     }
 
     QStringList m_calls;
-};
-
-class RecordingTitler : public ITitler
-{
-public:
-    void registerCallBack(ITitlerCallBack* target) override
-    {
-        callBack.reset(target);
-        calls.append(target != nullptr ? "registerCallBack" : "registerCallBack null");
-    }
-    void showTitlerCreate(_CALL_TITLER_TYPE type) override { calls.append(QString("create %1").arg(type)); }
-    void showTitlerEdit(_SHOW_TITLER_PARAMTER p) override
-    {
-        calls.append(QString("edit %1 %2").arg(p.type).arg(say(p.path)));
-    }
-    void showDialogMaskWidget(bool show) override { calls.append(QString("dialog %1").arg(show)); }
-    void showMessageMaskWidget(bool show) override { calls.append(QString("message %1").arg(show)); }
-
-    QStringList calls;
-    std::unique_ptr<ITitlerCallBack> callBack;
-};
-
-class RecordingCallBack : public ITitlerCallBack
-{
-public:
-    void finishTitlerCreateCallback(_CALLBACK_TITLER_PARAMTER param) override
-    {
-        type = param.type;
-        path = param.path;
-        count = param.count;
-        paths = TitlerParams::unpackPaths(param);
-    }
-
-    int type = -1;
-    int count = -1;
-    std::wstring path;
-    std::vector<std::wstring> paths;
 };
 
 } // namespace
@@ -642,7 +607,7 @@ void tst_servicetable::randomPayloadsReachNothingBad()
         bombard(*adapter);
         QVERIFY(!m_client.take().isEmpty());
     }
-    RecordingTitler titler;
+    FakeTitler titler;
     TitlerAdapter titlerAdapter(117);
     titlerAdapter.setTarget(static_cast<ITitler*>(&titler));
     bombard(titlerAdapter);
@@ -651,7 +616,7 @@ void tst_servicetable::randomPayloadsReachNothingBad()
 
 void tst_servicetable::titler()
 {
-    RecordingTitler titler;
+    FakeTitler titler;
     auto* adapter = new TitlerAdapter(117);
     adapter->setTarget(static_cast<ITitler*>(&titler));
     adapter->setProxyFactory(this);
@@ -660,7 +625,8 @@ void tst_servicetable::titler()
     proxy.setSender(m_toServer.get());
     proxy.setReceiver(m_clientReceiver.get());
     proxy.setAdapterFactory(this);
-    RecordingCallBack callBack;
+    Answers answers;
+    FakeTitlerCallBack callBack(answers);
     proxy.registerCallBack(&callBack);
     proxy.showTitlerCreate(7);
     proxy.showTitlerEdit({8, TEXT});
@@ -670,16 +636,16 @@ void tst_servicetable::titler()
              (QStringList{"registerCallBack", "create 7", "edit 8 " + QTEXT, "dialog 1", "message 0"}));
     simplebuffer paths = TitlerParams::serialize_showTitlerEdit_param({0, L""}); // not a list of texts
     titler.callBack->finishTitlerCreateCallback({7, TEXT, paths.data, static_cast<int>(paths.size), 0});
-    QCOMPARE(callBack.type, 7);
-    QVERIFY(callBack.path == TEXT);
-    QCOMPARE(callBack.count, 0);
-    QVERIFY(callBack.paths.empty());
+    QCOMPARE(answers.last.type, 7);
+    QVERIFY(answers.last.path == TEXT);
+    QCOMPARE(answers.last.count, 0);
+    QVERIFY(answers.paths.isEmpty());
     CSimpleBuffer::simplebuffer_destroy(&paths);
 }
 
 void tst_servicetable::titlerRegistrationWithinTheProcess()
 {
-    RecordingTitler titler;
+    FakeTitler titler;
     TitlerAdapter adapter(117);
     adapter.setTarget(static_cast<ITitler*>(&titler));
     adapter.setProxyFactory(this);
@@ -696,7 +662,7 @@ void tst_servicetable::titlerRegistrationWithinTheProcess()
 
 void tst_servicetable::titlerUnknownMethods()
 {
-    RecordingTitler titler;
+    FakeTitler titler;
     TitlerAdapter adapter(117);
     adapter.setTarget(static_cast<ITitler*>(&titler));
     for (const long method : {0L, 6L, -1L}) {

@@ -1,10 +1,10 @@
 // The property panel in a window with simulated fingers, with log and settings in folders of the test.
 #pragma once
 
-#include "canvas/MessageBoxController.h"
 #include "document/TText.h"
 #include "panel/TextToolsPanel.h"
 #include "support/IPathManagerEx.h"
+#include "tests/fakes/FakeMessageBoxController.h"
 #include "tests/support/LogFixture.h"
 #include "tests/touchui/Taps.h"
 
@@ -18,26 +18,6 @@
 #include <QTest>
 #include <QTouchEvent>
 #include <memory>
-
-class PostedMessages : public MessageBoxController
-{
-public:
-    void setFactory(TitlerToolFactory*) override {}
-    void postMessage(MessageDef::Message_ID id) override { posted.append(int(id)); }
-    void postMessage(MessageDef::Message_ID id, QString) override { posted.append(int(id)); }
-    void postMessage(MessageDef::Message_ID id, MessageDefine::_emBoxType, QString) override
-    {
-        posted.append(int(id));
-    }
-    void setMessageMainWindow(QWidget*) override {}
-    bool GetTitlerIsTop() override { return true; }
-    QMap<QString, QString> getMapData() override { return {}; }
-    void closeMessage(MessageDefine::_emCloseType) override {}
-
-    QList<int> posted;
-};
-
-inline PostedMessages* postedMessages = nullptr;
 
 // The environment of one test program. Make it before anything is logged or settings are read.
 class PanelEnvironment
@@ -55,15 +35,8 @@ public:
                         "path=\"fonts\"/></PathInfo>");
         paths.close();
         device.reset(QTest::createTouchDevice());
-        postedMessages = &messages;
-        MessageBoxController::setProvider([]() -> MessageBoxController* { return postedMessages; }, [] {});
     }
-    ~PanelEnvironment()
-    {
-        MessageBoxController::setProvider(nullptr, nullptr);
-        postedMessages = nullptr;
-        IPathManagerEx::clearUp();
-    }
+    ~PanelEnvironment() { IPathManagerEx::clearUp(); }
 
     // Returns "[area] number: text" for each line of the operation log since the last call.
     QStringList newLogLines() { return log.takeOperations(); }
@@ -86,7 +59,7 @@ public:
     void tap(QWidget* widget) { touch(widget, widget->rect().center()); }
 
     QTemporaryDir folder;
-    PostedMessages messages;
+    FakeMessageBoxController messages;
     std::unique_ptr<QPointingDevice> device;
     LogFixture log;
 };

@@ -282,7 +282,7 @@ void tst_sizetoolbox::typedSizes()
         if (size == 0) {
             QVERIFY(changed.isEmpty());
             QCOMPARE(text(), before);
-            QCOMPARE(m_environment->messages.posted, QList<int>{111});
+            QCOMPARE(m_environment->messages.ids(), QList<int>{111});
             QCOMPARE(m_box->fontSizes(), sizes);
         } else {
             QCOMPARE(changed.size(), 1);
@@ -395,7 +395,7 @@ void tst_sizetoolbox::halfTypedSizeWhenTheFieldIsLeft()
     edit()->insert(QStringLiteral("7"));
     other.setFocus();
     QCOMPARE(text(), QStringLiteral("40+"));
-    QCOMPARE(m_environment->messages.posted, QList<int>{111});
+    QCOMPARE(m_environment->messages.ids(), QList<int>{111});
     QVERIFY(!m_box->isEditing() && edit()->isReadOnly());
     QVERIFY(other.hasFocus());
     m_environment->messages.posted.clear();
@@ -431,7 +431,7 @@ void tst_sizetoolbox::keyboardClosedAfterARefusedSize()
     QCoreApplication::sendEvent(combo(), &closed);
     QVERIFY(!m_box->isEditing());
     QCOMPARE(text(), QStringLiteral("64"));
-    QCOMPARE(m_environment->messages.posted, QList<int>{111});
+    QCOMPARE(m_environment->messages.ids(), QList<int>{111});
 }
 
 // The keyboard is a window of another process, which takes the activation when it is touched.

@@ -3,7 +3,7 @@
 
 #include "panel/SizeBoxLineEdit.h"
 #include "panel/SizeToolBox.h"
-#include "tests/touchui/FakeService.h"
+#include "tests/fakes/FakeSoftKeyBoardController.h"
 #include "touchui/KSCombobox.h"
 #include "touchui/KSInputContext.h"
 #include "touchui/KSPushbutton.h"
@@ -48,7 +48,7 @@ private:
 
     std::unique_ptr<PanelEnvironment> m_environment;
     std::unique_ptr<QWidget> m_window;
-    FakeService m_service;
+    FakeSoftKeyBoardController m_service;
     KSInputContext* m_context = nullptr;
     SizeToolBox* m_box = nullptr;
     QLineEdit* m_other = nullptr;

@@ -1,6 +1,5 @@
 #pragma once
 
-#include "../library/TemplateFixture.h"
 #include "TitleAccount.h"
 #include "app/EditTitlerController.h"
 #include "app/ShowMessageController.h"
@@ -9,6 +8,7 @@
 #include "library/FolderNameRules.h"
 #include "messaging/services/ServiceFamilies.h"
 #include "tests/app/Siblings.h"
+#include "tests/library/TemplateFixture.h"
 
 #include <QRandomGenerator>
 #include <thread>

@@ -1,6 +1,6 @@
 #pragma once
 
-#include "messaging/services/ISoftKeyBoardController.h"
+#include "tests/fakes/FakeSoftKeyBoardController.h"
 #include "touchui/KSInputContext.h"
 
 #include <QEvent>
@@ -8,14 +8,13 @@
 
 // A soft keyboard service for the random tests: keeps whether the keyboard is shown, and answers as the real
 // service does.
-class SoftKeyboardStandIn : public ISoftKeyBoardController
+class SoftKeyboardStandIn : public FakeSoftKeyBoardController
 {
 public:
     bool isUp() const { return m_up; }
     // Returns whether the field is a single line for a folder's name or a number, and not a text on the
     // canvas.
     bool isForLine() const { return m_field.fieldKind == 1; }
-    int limits() const { return m_limits; }
 
     // Sends the notice that the keyboard has closed, which the service sends with a delay.
     void settle()
@@ -72,11 +71,9 @@ public:
     void dummyClose() override { m_up = false; }
     void simpleClose() override { m_up = false; }
     void sendKey(SubCommonDefine::tagSoftKeyBoardKeyData) override {}
-    void sendLimitInfo(SubCommonDefine::taLimitInfo info) override { m_limits += info.code != 0 ? 1 : 0; }
+    void sendLimitInfo(SubCommonDefine::taLimitInfo) override {}
+    // A long run calls it often.
     void closeLimitBalloon() override {}
-    void registerCallBack(ISoftKeyBoardControllerCallBack*) override {}
-    void showMask() override {}
-    void hideMask() override {}
 
 private:
     static KSInputContext* context() { return KSInputContext::instance(); }
@@ -84,5 +81,4 @@ private:
     SubCommonDefine::tagSoftKeyBoardInitData m_field;
     bool m_up = false;
     bool m_tellClosed = false;
-    int m_limits = 0;
 };

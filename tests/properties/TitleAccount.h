@@ -1,7 +1,7 @@
 #pragma once
 
-#include "../library/TemplateFixture.h"
 #include "document/TitleParser.h"
+#include "tests/library/TemplateFixture.h"
 
 #include <QDirIterator>
 #include <QMap>

@@ -319,7 +319,6 @@ void ignoreDebug(QtMsgType type, const QMessageLogContext&, const QString& text)
 void tst_canvasscene_undo::initTestCase()
 {
     qRegisterMetaType<TText*>("TText*");
-    MessageBoxController::setProvider([]() -> MessageBoxController* { return messages; }, []() {});
     m_edits = runLength("TITLER_EDITS", DefaultEdits);
     qInfo("seed %u, %d edits", quint32(RandomSeed(DefaultSeed)), m_edits);
     // Every step saves the title; in memory that does not wait for a disk.
@@ -331,7 +330,7 @@ void tst_canvasscene_undo::initTestCase()
 
 void tst_canvasscene_undo::init()
 {
-    messages = new FakeMessages;
+    messages = new FakeMessageBoxController;
     InputLanguageFonts::resetLastFonts();
     InputLanguageFonts::mInputLanguage = 2;
     InputLanguageFonts::IS_CN_MODULE = false;

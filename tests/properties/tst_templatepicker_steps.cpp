@@ -63,8 +63,8 @@ private:
     TemplateTab* tab() const { return mPicker->userTab(); }
 
     TemplateFixture mFixture;
-    MessageRecorder mMessages;
-    TitleReportRecorder mReports;
+    FakeMessageBoxController mMessages;
+    FakeTitleChangeReporter mReports;
     std::unique_ptr<TemplatePicker> mPicker;
     QRandomGenerator mRandom;
     QStringList mNames;

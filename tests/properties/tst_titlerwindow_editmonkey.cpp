@@ -1,7 +1,5 @@
 // Many touches anywhere on the canvas and the panel of the real window. TITLER_SEED repeats a run,
 // TITLER_TOUCHES changes its length: a hundred thousand take some minutes.
-#include "../canvas/StyleProperties.h"
-#include "../library/LibraryFixture.h"
 #include "CanvasFingers.h"
 #include "MonkeyGround.h"
 #include "document/Archive.h"
@@ -10,6 +8,8 @@
 #include "document/TitleParser.h"
 #include "document/TitleParserUtility.h"
 #include "tests/app/Siblings.h"
+#include "tests/canvas/StyleProperties.h"
+#include "tests/library/LibraryFixture.h"
 #include "tests/support/RandomSeed.h"
 
 #include <QDir>

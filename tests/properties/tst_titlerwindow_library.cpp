@@ -4,7 +4,6 @@
 // be brought back may be gone from disk.
 //
 // TITLER_STEPS changes the length, TITLER_SEED the course.
-#include "../library/TemplateFixture.h"
 #include "LibraryModel.h"
 #include "app/APPEventFilter.h"
 #include "app/EditContextController.h"
@@ -20,6 +19,7 @@
 #include "library/TemplateTab.h"
 #include "messaging/services/ServiceFamilies.h"
 #include "tests/app/Siblings.h"
+#include "tests/library/TemplateFixture.h"
 #include "tests/support/RandomSeed.h"
 #include "touchui/KSInputContext.h"
 #include "touchui/KSPushbutton.h"

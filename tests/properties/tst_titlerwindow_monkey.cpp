@@ -2,7 +2,6 @@
 // the palette, both pickers and their keyboard, sessions that begin and end, and what other processes do
 // meanwhile. TITLER_SEED repeats a run, TITLER_TOUCHES changes its length: a hundred thousand take some
 // minutes.
-#include "../canvas/CanvasTestTools.h"
 #include "LibraryModel.h"
 #include "MonkeyGround.h"
 #include "OtherProcesses.h"
@@ -11,6 +10,8 @@
 #include "WindowFingers.h"
 #include "messaging/services/ITitler.h"
 #include "tests/app/Siblings.h"
+#include "tests/canvas/CanvasTestTools.h"
+#include "tests/fakes/FakeTitlerCallBack.h"
 #include "tests/support/RandomSeed.h"
 #include "touchui/CustomTreeDelegete.h"
 
@@ -146,26 +147,6 @@ private:
     int mLooks = 0;
 };
 
-namespace
-{
-
-// Where the answer of a create session goes.
-class Asker : public ITitlerCallBack
-{
-public:
-    explicit Asker(Counts& counts) : m_counts(counts) {}
-    void finishTitlerCreateCallback(_CALLBACK_TITLER_PARAMTER param) override
-    {
-        ++m_counts[QStringLiteral("answers to the asker")];
-        m_counts[QStringLiteral("titles in answers")] += param.count;
-    }
-
-private:
-    Counts& m_counts;
-};
-
-} // namespace
-
 void tst_titlerwindow_monkey::initTestCase()
 {
     mSeed = RandomSeed(DefaultSeed);
@@ -183,7 +164,11 @@ void tst_titlerwindow_monkey::initTestCase()
     mDevice->setParent(this);
     mWindow = makeWaitingWindow();
     KSInputContext::instance()->setKeyBoardController(&mKeyboard);
-    EditContextController::getInstance()->resultCallBack(new Asker(mCounts));
+    EditContextController::getInstance()->resultCallBack(
+        new FakeTitlerCallBack([this](const _CALLBACK_TITLER_PARAMTER& param) {
+            ++mCounts[QStringLiteral("answers to the asker")];
+            mCounts[QStringLiteral("titles in answers")] += param.count;
+        }));
     mOthers = std::make_unique<OtherProcesses>(mSiblings, mFiles, mAccount, mCounts, mSeed + 1);
     mFingers = std::make_unique<WindowFingers>(*mWindow, mDevice, mSeed, mKeyboard, *mOthers,
                                                mFiles.titleRoot(), mCounts);

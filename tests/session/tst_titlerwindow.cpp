@@ -1,6 +1,4 @@
 // The main window against siblings that only listen: layout, requests, closing, masks, move mode, language.
-#include "../library/LibraryFixture.h"
-#include "../support/LogFixture.h"
 #include "app/APPEventFilter.h"
 #include "app/EditContextController.h"
 #include "app/EditTitlerController.h"
@@ -23,6 +21,8 @@
 #include "library/ArchiveList.h"
 #include "messaging/services/ServiceFamilies.h"
 #include "tests/app/Siblings.h"
+#include "tests/library/LibraryFixture.h"
+#include "tests/support/LogFixture.h"
 #include "touchui/KSInputContext.h"
 #include "touchui/KSPushbutton.h"
 

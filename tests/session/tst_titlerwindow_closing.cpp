@@ -1,6 +1,5 @@
 // The end of a session in every state that it may be in, by every way to end it: what the operator saw is on
 // disk, whole and nothing beside it.
-#include "../library/LibraryFixture.h"
 #include "app/APPEventFilter.h"
 #include "app/EditContextController.h"
 #include "app/TitlerPowerController.h"
@@ -13,8 +12,9 @@
 #include "library/ArchiveMenu.h"
 #include "messaging/services/ServiceFamilies.h"
 #include "support/FileSyncQueue.h"
-#include "tests/app/RecordingCallBack.h"
 #include "tests/app/Siblings.h"
+#include "tests/fakes/FakeTitlerCallBack.h"
+#include "tests/library/LibraryFixture.h"
 #include "touchui/KSInputContext.h"
 
 #include <QApplication>
@@ -257,7 +257,7 @@ void tst_titlerwindow_closing::begin(Ending ending)
     QTRY_VERIFY(list()->archiveItem(2) && list()->archiveItem(2)->hasChildWidgets());
     QCOMPARE(stems(), mOrder);
     EditContextController* context = EditContextController::getInstance();
-    context->resultCallBack(new RecordingCallBack(mAnswers));
+    context->resultCallBack(new FakeTitlerCallBack(mAnswers));
     if (ending == AnswerOfCreation)
         context->showTitlerCreate(3); // the window is open: only the context takes note
     choose(ArchiveAction::ACTION_COPY, 0);

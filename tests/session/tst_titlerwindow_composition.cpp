@@ -1,5 +1,4 @@
 // A composition of an input method that is under way when the operator leaves the text for something else.
-#include "../library/LibraryFixture.h"
 #include "app/APPEventFilter.h"
 #include "app/TitlerWindow.h"
 #include "canvas/CanvasScene.h"
@@ -8,7 +7,8 @@
 #include "library/ArchiveItem.h"
 #include "library/ArchiveList.h"
 #include "tests/app/Siblings.h"
-#include "tests/touchui/FakeInputMethod.h"
+#include "tests/fakes/FakeInputMethod.h"
+#include "tests/library/LibraryFixture.h"
 #include "touchui/KSInputContext.h"
 #include "touchui/KSPushbutton.h"
 

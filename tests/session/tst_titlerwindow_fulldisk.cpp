@@ -1,8 +1,5 @@
 // The end of a session whose work the disk refuses, or takes only slowly: what the operator is asked, what he
 // sees and who waits for what.
-#include "../library/LibraryFixture.h"
-#include "../support/FullDisk.h"
-#include "../support/LogFixture.h"
 #include "app/APPEventFilter.h"
 #include "app/EditContextController.h"
 #include "app/SavingNotice.h"
@@ -15,8 +12,11 @@
 #include "messaging/services/ServiceFamilies.h"
 #include "support/FileSyncQueue.h"
 #include "support/RefusedWrites.h"
-#include "tests/app/RecordingCallBack.h"
 #include "tests/app/Siblings.h"
+#include "tests/fakes/FakeTitlerCallBack.h"
+#include "tests/library/LibraryFixture.h"
+#include "tests/support/FullDisk.h"
+#include "tests/support/LogFixture.h"
 #include "touchui/KSInputContext.h"
 
 #include <QApplication>
@@ -298,7 +298,7 @@ void tst_titlerwindow_fulldisk::slowDiskKeepsNobodyWaiting()
     QVERIFY(FileSyncQueue::flush(std::chrono::seconds(30)));
     Answers answers;
     EditContextController* context = EditContextController::getInstance();
-    context->resultCallBack(new RecordingCallBack(answers));
+    context->resultCallBack(new FakeTitlerCallBack(answers));
     context->showTitlerCreate(3);
     choose(ArchiveAction::ACTION_COPY, 0);
     choose(ArchiveAction::ACTION_PASTE, 0);

@@ -1,7 +1,5 @@
 // Every touch widget of the program, interrupted in every way while a finger works it: the window with its
 // list, canvas and panel, move mode, and each of its dialogs.
-#include "../gallery/Interruptions.h"
-#include "../library/TemplateFixture.h"
 #include "app/EditContextController.h"
 #include "app/TitlerWindow.h"
 #include "app/ToolsBar.h"
@@ -15,6 +13,8 @@
 #include "panel/ColorPalette.h"
 #include "panel/TextToolsPanel.h"
 #include "tests/app/Siblings.h"
+#include "tests/gallery/Interruptions.h"
+#include "tests/library/TemplateFixture.h"
 #include "touchui/KSInputContext.h"
 #include "touchui/KSMenu.h"
 #include "touchui/KSTreeModel.h"

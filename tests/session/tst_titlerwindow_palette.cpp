@@ -1,7 +1,5 @@
 // A colour that is only previewed, whatever happens while the palette is open: every character gets its own
 // colour back, and neither the file, the style for the next run nor a new text learns of the preview.
-#include "../library/LibraryFixture.h"
-#include "../touchui/Taps.h"
 #include "app/APPEventFilter.h"
 #include "app/TitlerWindow.h"
 #include "canvas/CanvasScene.h"
@@ -16,6 +14,8 @@
 #include "panel/EdgeSizeSlider.h"
 #include "panel/TextToolsPanel.h"
 #include "tests/app/Siblings.h"
+#include "tests/library/LibraryFixture.h"
+#include "tests/touchui/Taps.h"
 #include "touchui/KSInputContext.h"
 #include "touchui/KSSLider.h"
 #include "touchui/KSSoftKeyboardCursorSettingEvent.h"

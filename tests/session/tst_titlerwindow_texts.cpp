@@ -1,7 +1,5 @@
 // The texts of a title on all the ways that an operator goes away from them: nothing blank is saved, an
 // emptied title is, the soft keyboard is put away; and what a new text looks like.
-#include "../library/LibraryFixture.h"
-#include "../touchui/Taps.h"
 #include "app/APPEventFilter.h"
 #include "app/EditContextController.h"
 #include "app/TitlerPowerController.h"
@@ -18,9 +16,11 @@
 #include "panel/ColorButton.h"
 #include "panel/ColorPalette.h"
 #include "panel/TextToolsPanel.h"
-#include "tests/app/RecordingCallBack.h"
 #include "tests/app/Siblings.h"
+#include "tests/fakes/FakeTitlerCallBack.h"
+#include "tests/library/LibraryFixture.h"
 #include "tests/properties/SoftKeyboardStandIn.h"
+#include "tests/touchui/Taps.h"
 #include "touchui/KSInputContext.h"
 #include "touchui/KSPushbutton.h"
 
@@ -288,7 +288,7 @@ void tst_titlerwindow_texts::take(Road road)
         mWindow->closeTitlerWindow();
         break;
     case CloseWithQuestion:
-        EditContextController::getInstance()->resultCallBack(new RecordingCallBack(mAnswers));
+        EditContextController::getInstance()->resultCallBack(new FakeTitlerCallBack(mAnswers));
         EditContextController::getInstance()->insertFilePath(L"new.xml");
         mWindow->closeTitlerWindow();
         break;

@@ -1,6 +1,5 @@
 // The window and its template picker: how the dialog opens and closes, and what reaches it from list,
 // siblings and language.
-#include "../library/TemplateFixture.h"
 #include "app/APPEventFilter.h"
 #include "app/EditContextController.h"
 #include "app/EditTitlerController.h"
@@ -14,6 +13,7 @@
 #include "library/TemplatePicker.h"
 #include "library/TemplateTab.h"
 #include "tests/app/Siblings.h"
+#include "tests/library/TemplateFixture.h"
 #include "touchui/KSInputContext.h"
 #include "touchui/KSPushbutton.h"
 

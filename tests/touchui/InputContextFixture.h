@@ -1,8 +1,8 @@
 #pragma once
 
 #include "messaging/services/SubCommonDefine.h"
-#include "tests/touchui/FakeInputMethod.h"
-#include "tests/touchui/FakeService.h"
+#include "tests/fakes/FakeInputMethod.h"
+#include "tests/fakes/FakeSoftKeyBoardController.h"
 #include "touchui/KSAppEventFilter.h"
 #include "touchui/KSInputContext.h"
 #include "touchui/KSInputFocusManager.h"
@@ -91,7 +91,7 @@ private Q_SLOTS:
 protected:
     KSInputContext* m_context = nullptr;
     std::unique_ptr<KSAppEventFilter> m_filter;
-    std::unique_ptr<FakeService> m_service;
+    std::unique_ptr<FakeSoftKeyBoardController> m_service;
     std::unique_ptr<QWidget> m_window;
     ClosingEdit* m_edit = nullptr;
     QLineEdit* m_other = nullptr;
@@ -112,7 +112,7 @@ inline void InputContextFixture::init()
     QVERIFY(m_context != nullptr);
     m_filter = std::make_unique<KSAppEventFilter>();
     qApp->installEventFilter(m_filter.get());
-    m_service = std::make_unique<FakeService>();
+    m_service = std::make_unique<FakeSoftKeyBoardController>();
     m_context->setKeyBoardController(m_service.get());
     m_window = std::make_unique<QWidget>();
     auto* layout = new QVBoxLayout(m_window.get());

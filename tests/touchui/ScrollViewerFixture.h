@@ -1,6 +1,6 @@
 #pragma once
 
-#include "ManualClock.h"
+#include "tests/fakes/ManualClock.h"
 #include "touchui/KSAppEventFilter.h"
 #include "touchui/KSBaseItemWidget.h"
 #include "touchui/KSEventDefaultMutexLockObject.h"

@@ -1,5 +1,5 @@
 // One list that follows a finger, tick by tick.
-#include "ManualClock.h"
+#include "tests/fakes/ManualClock.h"
 #include "touchui/Flicker.h"
 
 #include <QScrollArea>

@@ -1,6 +1,6 @@
 // Who may hold the touch: the lock kinds, the filter that asks them, and the lock between processes.
-#include "ManualClock.h"
-#include "touchui/ITitlerAPPEventFilterController.h"
+#include "tests/fakes/FakeTitlerAPPEventFilterController.h"
+#include "tests/fakes/ManualClock.h"
 #include "touchui/KSAppEventFilter.h"
 #include "touchui/KSEventClusterLockObject.h"
 #include "touchui/KSEventDefaultMutexLockObject.h"
@@ -20,17 +20,6 @@ using namespace APPEventDefine;
 
 namespace
 {
-
-class FakeController : public ITitlerAPPEventFilterController
-{
-public:
-    void initialize(TitlerToolFactory*) override {}
-    void sendAPPEvent(LOCKTYPE type, bool on) override { sent.append({type, on}); }
-    void informRestoreOriginal(EventRevicer receiver) override { informed.append(receiver); }
-
-    QList<QPair<int, bool>> sent;
-    QList<int> informed;
-};
 
 // Counts what reaches it, and swallows what it is told to.
 class Listener : public QObject
@@ -117,7 +106,7 @@ private:
 
     QPointingDevice* m_device = nullptr;
     std::unique_ptr<KSAppEventFilter> m_filter;
-    std::unique_ptr<FakeController> m_controller;
+    std::unique_ptr<FakeTitlerAPPEventFilterController> m_controller;
     std::unique_ptr<QWidget> m_window;
     TouchEventButton* m_first = nullptr;
     TouchEventButton* m_second = nullptr;
@@ -133,8 +122,7 @@ void tst_ksappeventfilter::initTestCase()
 
 void tst_ksappeventfilter::init()
 {
-    m_controller = std::make_unique<FakeController>();
-    ITitlerAPPEventFilterController::setInstance(m_controller.get());
+    m_controller = std::make_unique<FakeTitlerAPPEventFilterController>();
     m_filter = std::make_unique<KSAppEventFilter>();
     m_filter->registerLockObject(m_filter.get(), nullptr, LOCKOBJECT_DEFAULTMUTEX, nullptr);
     qApp->installEventFilter(m_filter.get());

@@ -1,5 +1,5 @@
 // The combo box and its list.
-#include "tests/touchui/ManualClock.h"
+#include "tests/fakes/ManualClock.h"
 #include "tests/touchui/TouchFixture.h"
 #include "touchui/CustomComboBoxDelegate.h"
 #include "touchui/CustomComboBoxView.h"

@@ -1,7 +1,7 @@
 // The touch tree under real fingers and the mouse, through the application's filter.
 #include "TreeViewFixture.h"
 
-#include "ManualClock.h"
+#include "tests/fakes/ManualClock.h"
 #include "touchui/KSEventMutexLockObject.h"
 
 class tst_kstreeview : public TreeViewFixture

@@ -1,6 +1,6 @@
 // One finger on a widget: what it makes of touch events, and everything that takes the finger away.
-#include "ManualClock.h"
 #include "TouchFixture.h"
+#include "tests/fakes/ManualClock.h"
 
 #include "touchui/OneFinger.h"
 

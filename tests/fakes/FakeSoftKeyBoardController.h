@@ -6,9 +6,11 @@
 #include <QList>
 #include <QString>
 #include <QStringList>
+#include <functional>
 
-// Replaces the process that shows the soft keyboard: records the calls and does not answer.
-class FakeService : public ISoftKeyBoardController
+// Replaces the process that shows the soft keyboard: records the calls, and answers only what a test lets it
+// answer.
+class FakeSoftKeyBoardController : public ISoftKeyBoardController
 {
 public:
     void show(SubCommonDefine::tagSoftKeyBoardInitData data) override
@@ -19,7 +21,12 @@ public:
     void close() override { calls.append(QStringLiteral("close")); }
     void dummyClose() override { calls.append(QStringLiteral("dummyClose")); }
     void simpleClose() override { calls.append(QStringLiteral("simpleClose")); }
-    void sendKey(SubCommonDefine::tagSoftKeyBoardKeyData key) override { keys.append(key); }
+    void sendKey(SubCommonDefine::tagSoftKeyBoardKeyData key) override
+    {
+        keys.append(key);
+        if (onKey)
+            onKey(key);
+    }
     void sendLimitInfo(SubCommonDefine::taLimitInfo info) override
     {
         calls.append(QStringLiteral("sendLimitInfo"));
@@ -32,9 +39,12 @@ public:
     {
         calls.append(QStringLiteral("registerCallBack"));
     }
+    bool isReachable() const override { return alive; }
 
     QStringList calls;
     QList<SubCommonDefine::tagSoftKeyBoardInitData> shown;
     QList<SubCommonDefine::tagSoftKeyBoardKeyData> keys;
     QList<SubCommonDefine::taLimitInfo> limits;
+    std::function<void(const SubCommonDefine::tagSoftKeyBoardKeyData&)> onKey; // may answer a key
+    bool alive = true;
 };
