@@ -1,9 +1,9 @@
 // The Move button and which events end the mode that it turns on.
 #include "app/MoveMode.h"
+#include "tests/touchui/TouchDevice.h"
 #include "touchui/KSPushbutton.h"
 
 #include <QMouseEvent>
-#include <QPointingDevice>
 #include <QTest>
 #include <QTouchEvent>
 #include <QWheelEvent>
@@ -26,7 +26,7 @@ private:
     std::unique_ptr<QWidget> mWindow;
     std::unique_ptr<MoveMode> mMode;
     QWidget* mList = nullptr;
-    std::unique_ptr<QPointingDevice> mDevice{QTest::createTouchDevice()};
+    TouchDevice mDevice;
 };
 
 void tst_movemode::init()
@@ -69,7 +69,7 @@ std::unique_ptr<QEvent> tst_movemode::event(QEvent::Type type, const QPointF& gl
     case QEvent::TouchBegin:
     case QEvent::TouchEnd:
         return std::make_unique<QTouchEvent>(
-            type, mDevice.get(), Qt::NoModifier,
+            type, mDevice, Qt::NoModifier,
             QList<QEventPoint>{QEventPoint(0, QEventPoint::Pressed, global, global)});
     case QEvent::Wheel:
         return std::make_unique<QWheelEvent>(global, global, QPoint(), QPoint(0, 120), Qt::NoButton,
@@ -118,7 +118,7 @@ void tst_movemode::endsWithPressesBesideTheList()
 void tst_movemode::touchWithoutPointsEndsNothing()
 {
     mMode->setOn(true);
-    const QTouchEvent touch(QEvent::TouchBegin, mDevice.get(), Qt::NoModifier, QList<QEventPoint>());
+    const QTouchEvent touch(QEvent::TouchBegin, mDevice, Qt::NoModifier, QList<QEventPoint>());
     QVERIFY(!mMode->isEndedBy(mWindow.get(), &touch, mList));
 }
 

@@ -1,6 +1,7 @@
 // The row of buttons above the canvas: taps, looks, enabling and the Canvas menu.
 #include "app/APPEventFilter.h"
 #include "app/ToolsBar.h"
+#include "tests/touchui/TouchDevice.h"
 #include "touchui/KSPushbutton.h"
 
 #include <QAction>
@@ -9,7 +10,6 @@
 #include <QImage>
 #include <QLabel>
 #include <QMenu>
-#include <QPointingDevice>
 #include <QSignalSpy>
 #include <QTemporaryDir>
 #include <QTest>
@@ -73,7 +73,7 @@ private:
     QMenu* menu() const { return m_bar->findChild<QMenu*>(); }
     void openMenu();
 
-    QPointingDevice* m_device = nullptr;
+    TouchDevice m_device;
     std::unique_ptr<QUndoStack> m_stack;
     std::unique_ptr<QWidget> m_window;
     ToolsBar* m_bar = nullptr;
@@ -84,8 +84,6 @@ void tst_toolsbar::initTestCase()
 {
     Q_INIT_RESOURCE(TitlerToolResource);
     Q_INIT_RESOURCE(UILibrary);
-    m_device = QTest::createTouchDevice();
-    m_device->setParent(this);
     APPEventFilter::instance();
 }
 

@@ -2,12 +2,11 @@
 
 #include "CanvasFixture.h"
 
-#include "tests/touchui/Taps.h"
+#include "tests/touchui/TouchDevice.h"
 #include "touchui/KSAppEventFilter.h"
 #include "touchui/TouchEventButton.h"
 
 #include <QApplication>
-#include <QPointingDevice>
 #include <QWidget>
 
 // The canvas at the left of a window, with a button to its right, for tests with fingers. The application's
@@ -15,7 +14,7 @@
 class TouchCanvas : public Canvas
 {
 public:
-    explicit TouchCanvas(QPointingDevice* device) : m_device(device)
+    explicit TouchCanvas(TouchDevice& device) : m_device(device)
     {
         m_filter.registerLockObject(&m_filter, nullptr, LOCKOBJECT_DEFAULTMUTEX, nullptr);
         qApp->installEventFilter(&m_filter);
@@ -57,7 +56,7 @@ public:
         quickTap(point);
         view.mouseClick();
     }
-    void quickTap(QPoint point) { tapOnce(view.viewport(), m_device, point); }
+    void quickTap(QPoint point) { m_device.tap(view.viewport(), point); }
     // Presses at the first point and moves to the second, without a release.
     void slide(QPoint from, QPoint to)
     {
@@ -133,5 +132,5 @@ private:
     }
 
     KSAppEventFilter m_filter;
-    QPointingDevice* m_device;
+    TouchDevice& m_device;
 };

@@ -1,9 +1,9 @@
 #include "canvas/GraphicsView.h"
+#include "tests/touchui/TouchDevice.h"
 
 #include <QApplication>
 #include <QGraphicsScene>
 #include <QGraphicsSceneMouseEvent>
-#include <QPointingDevice>
 #include <QSignalSpy>
 #include <QTest>
 
@@ -43,7 +43,6 @@ class tst_graphicsview : public QObject
     Q_OBJECT
 
 private Q_SLOTS:
-    void initTestCase();
     void init();
     void cleanup();
     void tapIsAClick();
@@ -58,16 +57,10 @@ private Q_SLOTS:
 private:
     void touch(QEventPoint::State state, QPoint point);
 
-    QPointingDevice* m_device = nullptr;
+    TouchDevice m_device;
     RecordingScene* m_scene = nullptr;
     GraphicsView* m_view = nullptr;
 };
-
-void tst_graphicsview::initTestCase()
-{
-    m_device = QTest::createTouchDevice();
-    m_device->setParent(this);
-}
 
 void tst_graphicsview::init()
 {

@@ -2,6 +2,7 @@
 
 #include "messaging/services/SubCommonDefine.h"
 #include "tests/fakes/FakeSoftKeyBoardController.h"
+#include "tests/touchui/TouchDevice.h"
 #include "touchui/KSInputContext.h"
 
 #include <QClipboard>
@@ -57,7 +58,7 @@ private:
     void sendCursor(int begin, int end, int current, int mode);
     void sendClose();
 
-    QPointingDevice* m_device = nullptr;
+    TouchDevice m_device;
     KSInputContext* m_context = nullptr;
     std::unique_ptr<FakeSoftKeyBoardController> m_keyboard;
 };
@@ -66,8 +67,6 @@ void tst_scenekeyboard::initTestCase()
 {
     qRegisterMetaType<TText*>("TText*");
     qApp->setObjectName(QStringLiteral("Titler"));
-    m_device = QTest::createTouchDevice();
-    m_device->setParent(this);
     m_context = KSInputContext::instance();
     QVERIFY(m_context);
 }

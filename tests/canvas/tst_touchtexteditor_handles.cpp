@@ -32,7 +32,7 @@ private:
     // Edits the first object and selects from anchor to position, with handles.
     void select(TouchCanvas& canvas, int anchor, int position);
 
-    QPointingDevice* m_device = nullptr;
+    TouchDevice m_device;
 };
 
 void tst_touchtexteditor_handles::initTestCase()
@@ -40,8 +40,6 @@ void tst_touchtexteditor_handles::initTestCase()
     Q_INIT_RESOURCE(TitlerToolResource);
     Q_INIT_RESOURCE(UILibrary);
     qRegisterMetaType<TText*>("TText*");
-    m_device = QTest::createTouchDevice();
-    m_device->setParent(this);
 }
 
 void tst_touchtexteditor_handles::init()

@@ -1,5 +1,7 @@
 #include "TouchCanvas.h"
 
+#include "tests/touchui/TouchDevice.h"
+
 #include <QTouchEvent>
 
 // What one finger does to the text objects of a canvas, as touches that pass the application's gate: select,
@@ -38,14 +40,12 @@ private Q_SLOTS:
     void fingerOnAButtonBeforeTheCanvas();
 
 private:
-    QPointingDevice* m_device = nullptr;
+    TouchDevice m_device;
 };
 
 void tst_touchtexteditor_taps::initTestCase()
 {
     qRegisterMetaType<TText*>("TText*");
-    m_device = QTest::createTouchDevice();
-    m_device->setParent(this);
 }
 
 void tst_touchtexteditor_taps::init()

@@ -6,13 +6,12 @@
 #include "library/ArchiveList.h"
 #include "library/ArchiveMenu.h"
 #include "tests/fakes/ManualClock.h"
-#include "tests/touchui/Taps.h"
+#include "tests/touchui/TouchDevice.h"
 #include "touchui/KSAppEventFilter.h"
 #include "touchui/KSMenu.h"
 
 #include <QCoreApplication>
 #include <QLabel>
-#include <QPointingDevice>
 #include <QScrollBar>
 #include <QTest>
 #include <QUndoStack>
@@ -32,7 +31,7 @@ public:
     static constexpr int TICK = 33;             // ms between two steps of a flick
     static constexpr int EDGE_SCROLL_TIME = 40; // ms
 
-    explicit TitleListFixture(QPointingDevice* device) : mDevice(device)
+    explicit TitleListFixture(TouchDevice& device) : mDevice(device)
     {
         mFilter.registerLockObject(&mFilter, nullptr, LOCKOBJECT_DEFAULTMUTEX, nullptr);
         QCoreApplication::instance()->installEventFilter(&mFilter);
@@ -119,7 +118,7 @@ public:
         ArchiveMenu* open = menu();
         const QPoint row =
             open->getMenuItemRect(static_cast<int>(open->actions().indexOf(open->action(type)))).center();
-        tapOnce(open, mDevice, row);
+        mDevice.tap(open, row);
     }
     void holdAndChoose(int row, ArchiveAction::ARCHIVE_ACTION_TYPE type)
     {
@@ -152,5 +151,5 @@ public:
 private:
     QTest::QTouchEventWidgetSequence touch() { return QTest::touchEvent(&window, mDevice); }
 
-    QPointingDevice* mDevice;
+    TouchDevice& mDevice;
 };

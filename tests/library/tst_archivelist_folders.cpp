@@ -1,6 +1,7 @@
 // Folders as other programs, full disks and torn writes leave them: what the title list makes of them.
 #include "TitleListFixture.h"
 #include "tests/support/FullDisk.h"
+#include "tests/touchui/TouchDevice.h"
 
 #include <QFileDevice>
 #include <QGraphicsPixmapItem>
@@ -67,7 +68,6 @@ class tst_archivelist_folders : public QObject
     Q_OBJECT
 
 private Q_SLOTS:
-    void initTestCase();
     void init();
     void cleanup();
 
@@ -100,15 +100,9 @@ private:
     FakeTitlerFolderReporter mFolders;
     FakeTitleChangeReporter mReports;
     FakeMessageBoxController mMessages;
-    QPointingDevice* mDevice = nullptr;
+    TouchDevice mDevice;
     std::unique_ptr<TitleListFixture> m;
 };
-
-void tst_archivelist_folders::initTestCase()
-{
-    mDevice = QTest::createTouchDevice();
-    mDevice->setParent(this);
-}
 
 void tst_archivelist_folders::init()
 {

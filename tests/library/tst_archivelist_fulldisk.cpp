@@ -6,6 +6,7 @@
 
 #include "document/FolderOrder.h"
 #include "support/RefusedWrites.h"
+#include "tests/touchui/TouchDevice.h"
 
 using Names = QStringList;
 
@@ -34,7 +35,6 @@ class tst_archivelist_fulldisk : public QObject
     Q_OBJECT
 
 private Q_SLOTS:
-    void initTestCase();
     void init();
     void cleanup();
 
@@ -78,15 +78,9 @@ private:
 
     LibraryFixture mFixture;
     FakeMessageBoxController mMessages;
-    QPointingDevice* mDevice = nullptr;
+    TouchDevice mDevice;
     std::unique_ptr<TitleListFixture> m;
 };
-
-void tst_archivelist_fulldisk::initTestCase()
-{
-    mDevice = QTest::createTouchDevice();
-    mDevice->setParent(this);
-}
 
 void tst_archivelist_fulldisk::init()
 {

@@ -2,6 +2,8 @@
 // read by and by, and every operation does what it does in a short folder.
 #include "TitleListFixture.h"
 
+#include "tests/touchui/TouchDevice.h"
+
 #include <QLabel>
 #include <QSignalSpy>
 #include <unistd.h>
@@ -14,7 +16,6 @@ class tst_archivelist_longfolder : public QObject
     Q_OBJECT
 
 private Q_SLOTS:
-    void initTestCase();
     void init();
     void cleanup();
 
@@ -136,17 +137,11 @@ private:
     FakeTitlerFolderReporter mFolders;
     FakeTitleChangeReporter mReports;
     FakeMessageBoxController mMessages;
-    QPointingDevice* mDevice = nullptr;
+    TouchDevice mDevice;
     QString mPattern;
     int mFolderNumber = 0;
     std::unique_ptr<TitleListFixture> m;
 };
-
-void tst_archivelist_longfolder::initTestCase()
-{
-    mDevice = QTest::createTouchDevice();
-    mDevice->setParent(this);
-}
 
 void tst_archivelist_longfolder::init()
 {

@@ -2,6 +2,7 @@
 // titles to other places.
 #include "TitleListFixture.h"
 
+#include "tests/touchui/TouchDevice.h"
 #include "touchui/KSEventMutexLockObject.h"
 
 #include <QSignalSpy>
@@ -16,7 +17,6 @@ class tst_archivelist_touch : public QObject
     Q_OBJECT
 
 private Q_SLOTS:
-    void initTestCase();
     void init();
     void cleanup();
 
@@ -90,15 +90,9 @@ private:
     FakeTitlerFolderReporter mFolders;
     FakeTitleChangeReporter mReports;
     FakeMessageBoxController mMessages;
-    QPointingDevice* mDevice = nullptr;
+    TouchDevice mDevice;
     std::unique_ptr<TitleListFixture> m;
 };
-
-void tst_archivelist_touch::initTestCase()
-{
-    mDevice = QTest::createTouchDevice();
-    mDevice->setParent(this);
-}
 
 void tst_archivelist_touch::init()
 {

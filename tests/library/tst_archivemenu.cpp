@@ -4,6 +4,7 @@
 
 #include "tests/fakes/FakeTitlerAPPEventFilterController.h"
 #include "tests/support/LogFixture.h"
+#include "tests/touchui/TouchDevice.h"
 
 #include <QSignalSpy>
 #include <QTemporaryDir>
@@ -33,7 +34,6 @@ class tst_archivemenu : public QObject
     Q_OBJECT
 
 private Q_SLOTS:
-    void initTestCase();
     void cleanupTestCase();
     void init();
     void cleanup();
@@ -70,16 +70,10 @@ private:
     LibraryFixture mFixture;
     LogFixture mLog;
     FakeMessageBoxController mMessages;
-    QPointingDevice* mDevice = nullptr;
+    TouchDevice mDevice;
     std::unique_ptr<FakeTitlerAPPEventFilterController> mEvents;
     std::unique_ptr<TitleListFixture> m;
 };
-
-void tst_archivemenu::initTestCase()
-{
-    mDevice = QTest::createTouchDevice();
-    mDevice->setParent(this);
-}
 
 void tst_archivemenu::cleanupTestCase()
 {

@@ -1,6 +1,6 @@
 // The template picker under a finger, on folders.
 #include "TemplateFixture.h"
-#include "tests/touchui/Taps.h"
+#include "tests/touchui/TouchDevice.h"
 #include "tests/touchui/TouchFixture.h"
 
 #include "library/ArchiveItem.h"
@@ -718,7 +718,7 @@ private:
     void tap(QWidget* widget)
     {
         QVERIFY(widget->isVisible());
-        tapOnce(mPicker.get(), mDevice, centre(widget));
+        mDevice.tap(mPicker.get(), centre(widget));
     }
 
     void tapItem(TemplateTab* tab, int index)
@@ -771,11 +771,7 @@ private:
     TemplateFixture mFixture;
     FakeTitleChangeReporter mReports;
     FakeMessageBoxController mMessages;
-    QPointingDevice* mDevice = [this] {
-        QPointingDevice* device = QTest::createTouchDevice();
-        device->setParent(this);
-        return device;
-    }();
+    TouchDevice mDevice;
     std::unique_ptr<TemplatePicker> mPicker;
 };
 

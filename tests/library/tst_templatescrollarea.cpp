@@ -1,5 +1,6 @@
 // One finger on a grid of buttons: taps, drags, flicks, and what further fingers may not do.
 #include "library/TemplateScrollArea.h"
+#include "tests/touchui/TouchDevice.h"
 
 #include <QGridLayout>
 #include <QPushButton>
@@ -277,11 +278,7 @@ private:
     QPushButton* pressed(int index) const { return mPressed->at(index).at(0).value<QPushButton*>(); }
     int value() const { return mArea->verticalScrollBar()->value(); }
 
-    QPointingDevice* mDevice = [this] {
-        QPointingDevice* device = QTest::createTouchDevice();
-        device->setParent(this);
-        return device;
-    }();
+    TouchDevice mDevice;
     std::unique_ptr<TemplateScrollArea> mArea;
     std::unique_ptr<QSignalSpy> mPressed;
     QList<QPushButton*> mButtons;

@@ -6,12 +6,11 @@
 #include "support/IPathManagerEx.h"
 #include "tests/fakes/FakeMessageBoxController.h"
 #include "tests/support/LogFixture.h"
-#include "tests/touchui/Taps.h"
+#include "tests/touchui/TouchDevice.h"
 
 #include <QDir>
 #include <QFile>
 #include <QGuiApplication>
-#include <QPointingDevice>
 #include <QScreen>
 #include <QSignalSpy>
 #include <QTemporaryDir>
@@ -34,7 +33,6 @@ public:
             paths.write("<?xml version=\"1.0\"?><PathInfo><SystemSetting path=\"settings\"/><Font "
                         "path=\"fonts\"/></PathInfo>");
         paths.close();
-        device.reset(QTest::createTouchDevice());
     }
     ~PanelEnvironment() { IPathManagerEx::clearUp(); }
 
@@ -54,13 +52,13 @@ public:
     void touch(QWidget* widget, QPoint point)
     {
         bringOnScreen(widget, point);
-        tapOnce(widget, device.get(), point);
+        device.tap(widget, point);
     }
     void tap(QWidget* widget) { touch(widget, widget->rect().center()); }
 
     QTemporaryDir folder;
     FakeMessageBoxController messages;
-    std::unique_ptr<QPointingDevice> device;
+    TouchDevice device;
     LogFixture log;
 };
 

@@ -153,12 +153,12 @@ void tst_colorpalette::pressedLook()
     m_palette->setCurrentColor(QStringLiteral("#FFFFFF"));
     for (const int index : {0, 7}) {
         ColorButton* each = button(index);
-        QTest::touchEvent(each, m_environment->device.get()).press(0, each->rect().center(), each);
+        QTest::touchEvent(each, m_environment->device).press(0, each->rect().center(), each);
         QCOMPARE(each->buttonState(),
                  index == 0 ? KSPushbutton::ButtonSelectedPressed : KSPushbutton::ButtonPressed);
         const QPoint away = each->rect().center() + QPoint(0, 300);
-        QTest::touchEvent(each, m_environment->device.get()).move(0, away, each);
-        QTest::touchEvent(each, m_environment->device.get()).release(0, away, each);
+        QTest::touchEvent(each, m_environment->device).move(0, away, each);
+        QTest::touchEvent(each, m_environment->device).release(0, away, each);
         QCOMPARE(each->isSelected(), index == 0);
     }
     QVERIFY(m_sent->isEmpty());
@@ -214,11 +214,10 @@ void tst_colorpalette::fingerDrags()
         };
         const auto local = [&](const QPoint& global) { return m_palette->mapFromGlobal(global); };
         if (touch) {
-            QTest::touchEvent(m_palette.get(), m_environment->device.get())
-                .press(0, local(from), m_palette.get());
-            QTest::touchEvent(m_palette.get(), m_environment->device.get())
+            QTest::touchEvent(m_palette.get(), m_environment->device).press(0, local(from), m_palette.get());
+            QTest::touchEvent(m_palette.get(), m_environment->device)
                 .move(0, local(from + offset), m_palette.get());
-            QTest::touchEvent(m_palette.get(), m_environment->device.get())
+            QTest::touchEvent(m_palette.get(), m_environment->device)
                 .release(0, local(from + offset), m_palette.get());
         } else {
             send(QEvent::MouseButtonPress, from);
@@ -238,9 +237,9 @@ void tst_colorpalette::buttonsDoNotDrag()
 {
     ColorButton* each = button(3);
     const QPoint before = m_palette->pos();
-    QTest::touchEvent(each, m_environment->device.get()).press(0, each->rect().center(), each);
-    QTest::touchEvent(each, m_environment->device.get()).move(0, QPoint(100, 100), each);
-    QTest::touchEvent(each, m_environment->device.get()).release(0, QPoint(100, 100), each);
+    QTest::touchEvent(each, m_environment->device).press(0, each->rect().center(), each);
+    QTest::touchEvent(each, m_environment->device).move(0, QPoint(100, 100), each);
+    QTest::touchEvent(each, m_environment->device).release(0, QPoint(100, 100), each);
     QCOMPARE(m_palette->pos(), before);
 }
 

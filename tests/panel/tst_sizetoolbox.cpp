@@ -206,11 +206,11 @@ void tst_sizetoolbox::listIsScrolledByAFinger()
     QCOMPARE(bar->value(), 0);
     const QPoint low(20, list->viewport()->height() - 10);
     QWidget* viewport = list->viewport();
-    QTest::touchEvent(viewport, m_environment->device.get()).press(0, low, viewport);
-    QTest::touchEvent(viewport, m_environment->device.get()).move(0, low - QPoint(0, 60), viewport);
-    QTest::touchEvent(viewport, m_environment->device.get()).move(0, low - QPoint(0, 150), viewport);
+    QTest::touchEvent(viewport, m_environment->device).press(0, low, viewport);
+    QTest::touchEvent(viewport, m_environment->device).move(0, low - QPoint(0, 60), viewport);
+    QTest::touchEvent(viewport, m_environment->device).move(0, low - QPoint(0, 150), viewport);
     QTRY_VERIFY(bar->value() > 40);
-    QTest::touchEvent(viewport, m_environment->device.get()).release(0, low - QPoint(0, 150), viewport);
+    QTest::touchEvent(viewport, m_environment->device).release(0, low - QPoint(0, 150), viewport);
     QVERIFY(changed.isEmpty()); // a drag chooses nothing
     QVERIFY(combo()->isPopupVisible());
     combo()->hidePopup();

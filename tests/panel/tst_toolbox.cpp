@@ -292,10 +292,10 @@ void tst_toolbox::edgeSliderDragIsOneStep()
     KSSLider* slider = box->slider()->slider();
     QVERIFY(QTest::qWaitForWindowExposed(box->slider()));
     const QPoint handle = slider->handleRect().center();
-    QTest::touchEvent(slider, m_environment->device.get()).press(0, handle, slider);
+    QTest::touchEvent(slider, m_environment->device).press(0, handle, slider);
     for (int x = handle.x(); x < slider->width() + 40; x += 20)
-        QTest::touchEvent(slider, m_environment->device.get()).move(0, QPoint(x, handle.y()), slider);
-    QTest::touchEvent(slider, m_environment->device.get())
+        QTest::touchEvent(slider, m_environment->device).move(0, QPoint(x, handle.y()), slider);
+    QTest::touchEvent(slider, m_environment->device)
         .release(0, QPoint(slider->width() + 40, handle.y()), slider);
     QCOMPARE(slider->value(), 10);
     QCOMPARE(m_environment->newLogLines(),
@@ -473,12 +473,12 @@ void tst_toolbox::pressedLookOnly()
     QSignalSpy spy(box, &AlignToolBox::alignChange);
     KSPushbutton* right = button("Icon_AlignRight");
     const QPoint center = right->rect().center();
-    QTest::touchEvent(right, m_environment->device.get()).press(0, center, right);
+    QTest::touchEvent(right, m_environment->device).press(0, center, right);
     QCOMPARE(right->paintedState(), KSPushbutton::ButtonPressed);
     QVERIFY(spy.isEmpty());
     // A finger that slides off lets go without choosing.
-    QTest::touchEvent(right, m_environment->device.get()).move(0, center + QPoint(0, 200), right);
-    QTest::touchEvent(right, m_environment->device.get()).release(0, center + QPoint(0, 200), right);
+    QTest::touchEvent(right, m_environment->device).move(0, center + QPoint(0, 200), right);
+    QTest::touchEvent(right, m_environment->device).release(0, center + QPoint(0, 200), right);
     QCOMPARE(right->paintedState(), KSPushbutton::ButtonRest);
     QVERIFY(spy.isEmpty());
 }

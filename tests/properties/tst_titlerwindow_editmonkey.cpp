@@ -11,6 +11,7 @@
 #include "tests/canvas/StyleProperties.h"
 #include "tests/library/LibraryFixture.h"
 #include "tests/support/RandomSeed.h"
+#include "tests/touchui/TouchDevice.h"
 
 #include <QDir>
 #include <QElapsedTimer>
@@ -98,7 +99,7 @@ private:
     QTemporaryDir mData;
     Siblings mSiblings;
     TitlerWindow* mWindow = nullptr;
-    QPointingDevice* mDevice = nullptr;
+    TouchDevice mDevice;
     int mTouches = 0;
 };
 
@@ -108,8 +109,6 @@ void tst_titlerwindow_editmonkey::initTestCase()
     qInfo("seed %u, %d touches", quint32(RandomSeed(DefaultSeed)), mTouches);
     MonkeyGround::showErrorsOnly();
     QVERIFY(mSiblings.listenOnFreePorts());
-    mDevice = QTest::createTouchDevice();
-    mDevice->setParent(this);
     mWindow = makeWaitingWindow();
 }
 

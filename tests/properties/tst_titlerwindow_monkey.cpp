@@ -13,6 +13,7 @@
 #include "tests/canvas/CanvasTestTools.h"
 #include "tests/fakes/FakeTitlerCallBack.h"
 #include "tests/support/RandomSeed.h"
+#include "tests/touchui/TouchDevice.h"
 #include "touchui/CustomTreeDelegete.h"
 
 #include <QElapsedTimer>
@@ -136,7 +137,7 @@ private:
     std::unique_ptr<OtherProcesses> mOthers;
     std::unique_ptr<WindowFingers> mFingers;
     TitlerWindow* mWindow = nullptr;
-    QPointingDevice* mDevice = nullptr;
+    TouchDevice mDevice;
     QEventLoop* mLoop = nullptr;
     QString mFailure;
     QStringList mDoings;
@@ -160,8 +161,6 @@ void tst_titlerwindow_monkey::initTestCase()
     mFiles.makePresets("templates_chs", {"xia", QString::fromUtf8("快讯")}, true);
     mFiles.makeUserTemplates(5);
     makeFolders();
-    mDevice = QTest::createTouchDevice();
-    mDevice->setParent(this);
     mWindow = makeWaitingWindow();
     KSInputContext::instance()->setKeyBoardController(&mKeyboard);
     EditContextController::getInstance()->resultCallBack(

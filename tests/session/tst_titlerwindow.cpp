@@ -23,6 +23,7 @@
 #include "tests/app/Siblings.h"
 #include "tests/library/LibraryFixture.h"
 #include "tests/support/LogFixture.h"
+#include "tests/touchui/TouchDevice.h"
 #include "touchui/KSInputContext.h"
 #include "touchui/KSPushbutton.h"
 
@@ -33,7 +34,6 @@
 #include <QFileInfo>
 #include <QLabel>
 #include <QPointer>
-#include <QPointingDevice>
 #include <QSignalSpy>
 #include <QTest>
 #include <QWindow>
@@ -108,6 +108,7 @@ private:
     LibraryFixture mFiles;
     Siblings mSiblings;
     LogFixture mLog;
+    TouchDevice mDevice;
     TitlerWindow* mWindow = nullptr;
 };
 
@@ -308,8 +309,6 @@ void tst_titlerwindow::closeWithNewFilesAsksFirst()
 void tst_titlerwindow::closeWhileFingersRestOnTitles()
 {
     const QString folder = writeFolder("fingers", {"t1", "t2", "t3", "t4", "t5"});
-    QPointingDevice* device = QTest::createTouchDevice();
-    device->setParent(this);
     const auto* close = mWindow->findChild<ToolsBar*>()->findChild<KSPushbutton*>(QStringLiteral("Close"));
     const QPoint onClose = close->mapTo(mWindow, close->rect().center());
     for (int session = 0; session < 4; ++session) {
@@ -318,10 +317,10 @@ void tst_titlerwindow::closeWhileFingersRestOnTitles()
         QCOMPARE(list()->count(), 5);
         const QPointer<ArchiveItem> item = list()->archiveItem(0);
         QWindow* window = mWindow->windowHandle();
-        QTest::touchEvent(window, device).press(0, onClose, window);
-        auto down = QTest::touchEvent(window, device, false);
-        auto up = QTest::touchEvent(window, device, false);
-        auto gone = QTest::touchEvent(window, device, false);
+        QTest::touchEvent(window, mDevice).press(0, onClose, window);
+        auto down = QTest::touchEvent(window, mDevice, false);
+        auto up = QTest::touchEvent(window, mDevice, false);
+        auto gone = QTest::touchEvent(window, mDevice, false);
         down.stationary(0);
         up.release(0, onClose, window);
         for (int i = 0; i < 5; ++i) {

@@ -15,12 +15,12 @@
 #include "tests/app/Siblings.h"
 #include "tests/fakes/FakeTitlerCallBack.h"
 #include "tests/library/LibraryFixture.h"
+#include "tests/touchui/TouchDevice.h"
 #include "touchui/KSInputContext.h"
 
 #include <QApplication>
 #include <QDeadlineTimer>
 #include <QMetaEnum>
-#include <QPointingDevice>
 #include <QSet>
 #include <QTest>
 #include <QTextCursor>
@@ -109,7 +109,7 @@ private:
 
     LibraryFixture mFixture;
     Siblings mSiblings;
-    QPointingDevice* mDevice = nullptr;
+    TouchDevice mDevice;
     std::unique_ptr<TitlerWindow> mWindow;
     QString mFolder;
     Answers mAnswers;
@@ -126,8 +126,6 @@ void tst_titlerwindow_closing::initTestCase()
     QVERIFY(mSiblings.listenOnFreePorts());
     Q_INIT_RESOURCE(UILibrary);
     Q_INIT_RESOURCE(TitlerToolResource);
-    mDevice = QTest::createTouchDevice();
-    mDevice->setParent(this);
 }
 
 void tst_titlerwindow_closing::init()

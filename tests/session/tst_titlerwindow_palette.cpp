@@ -15,7 +15,7 @@
 #include "panel/TextToolsPanel.h"
 #include "tests/app/Siblings.h"
 #include "tests/library/LibraryFixture.h"
-#include "tests/touchui/Taps.h"
+#include "tests/touchui/TouchDevice.h"
 #include "touchui/KSInputContext.h"
 #include "touchui/KSSLider.h"
 #include "touchui/KSSoftKeyboardCursorSettingEvent.h"
@@ -24,7 +24,6 @@
 #include <QApplication>
 #include <QInputMethodEvent>
 #include <QMetaEnum>
-#include <QPointingDevice>
 #include <QPushButton>
 #include <QTest>
 #include <QTextCursor>
@@ -101,7 +100,7 @@ private:
 
     LibraryFixture mFixture;
     Siblings mSiblings;
-    QPointingDevice* mDevice = nullptr;
+    TouchDevice mDevice;
     std::unique_ptr<TitlerWindow> mWindow;
     QString mFolder;
 };
@@ -111,8 +110,6 @@ void tst_titlerwindow_palette::initTestCase()
     QVERIFY(mSiblings.listenOnFreePorts());
     Q_INIT_RESOURCE(UILibrary);
     Q_INIT_RESOURCE(TitlerToolResource);
-    mDevice = QTest::createTouchDevice();
-    mDevice->setParent(this);
 }
 
 TText* tst_titlerwindow_palette::makeText(const QString& text, int id, float x, float y)
@@ -175,14 +172,14 @@ void tst_titlerwindow_palette::finger(QEventPoint::State state, const QWidget* w
 void tst_titlerwindow_palette::doubleTap(const QPoint& scenePlace)
 {
     const auto* view = find<GraphicsView>();
-    tapTwice(mWindow.get(), mDevice, view->mapTo(mWindow.get(), view->mapFromScene(scenePlace)));
+    mDevice.tap(mWindow.get(), view->mapTo(mWindow.get(), view->mapFromScene(scenePlace)), 2);
 }
 
 void tst_titlerwindow_palette::tap(const QPoint& scenePlace)
 {
     auto* view = find<GraphicsView>();
     view->mouseClick(); // no double tap
-    tapOnce(mWindow.get(), mDevice, view->mapTo(mWindow.get(), view->mapFromScene(scenePlace)));
+    mDevice.tap(mWindow.get(), view->mapTo(mWindow.get(), view->mapFromScene(scenePlace)));
     view->mouseClick();
 }
 

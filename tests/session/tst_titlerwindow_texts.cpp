@@ -20,7 +20,7 @@
 #include "tests/fakes/FakeTitlerCallBack.h"
 #include "tests/library/LibraryFixture.h"
 #include "tests/properties/SoftKeyboardStandIn.h"
-#include "tests/touchui/Taps.h"
+#include "tests/touchui/TouchDevice.h"
 #include "touchui/KSInputContext.h"
 #include "touchui/KSPushbutton.h"
 
@@ -28,7 +28,6 @@
 #include <QApplication>
 #include <QComboBox>
 #include <QMetaEnum>
-#include <QPointingDevice>
 #include <QTest>
 #include <QTextCursor>
 #include <QTimer>
@@ -162,7 +161,7 @@ private:
     LibraryFixture mFixture;
     Siblings mSiblings;
     SoftKeyboardStandIn mKeyboard;
-    QPointingDevice* mDevice = nullptr;
+    TouchDevice mDevice;
     std::unique_ptr<TitlerWindow> mWindow;
     QString mFolder;
     Answers mAnswers;
@@ -173,8 +172,6 @@ void tst_titlerwindow_texts::initTestCase()
     QVERIFY(mSiblings.listenOnFreePorts());
     Q_INIT_RESOURCE(UILibrary);
     Q_INIT_RESOURCE(TitlerToolResource);
-    mDevice = QTest::createTouchDevice();
-    mDevice->setParent(this);
 }
 
 void tst_titlerwindow_texts::init()
@@ -219,7 +216,7 @@ void tst_titlerwindow_texts::cleanup()
 
 void tst_titlerwindow_texts::tap(const QWidget* widget, const QPoint& place)
 {
-    tapOnce(mWindow.get(), mDevice, widget->mapTo(mWindow.get(), place));
+    mDevice.tap(mWindow.get(), widget->mapTo(mWindow.get(), place));
     view()->mouseClick(); // no double tap follows
 }
 

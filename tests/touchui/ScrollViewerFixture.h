@@ -1,5 +1,6 @@
 #pragma once
 
+#include "TouchDevice.h"
 #include "tests/fakes/ManualClock.h"
 #include "touchui/KSAppEventFilter.h"
 #include "touchui/KSBaseItemWidget.h"
@@ -7,7 +8,6 @@
 #include "touchui/KSScrollViewerWidget.h"
 
 #include <QApplication>
-#include <QPointingDevice>
 #include <QScrollBar>
 #include <QStringList>
 #include <QTest>
@@ -44,7 +44,7 @@ public:
     static constexpr int HEIGHT = 500;
     static constexpr int ROW = 104; // height with the gap
 
-    explicit ScrollViewerFixture(QPointingDevice* device) : mDevice(device)
+    explicit ScrollViewerFixture(TouchDevice& device) : mDevice(device)
     {
         mFilter.registerLockObject(&mFilter, nullptr, LOCKOBJECT_DEFAULTMUTEX, nullptr);
         QCoreApplication::instance()->installEventFilter(&mFilter);
@@ -110,7 +110,7 @@ public:
     KSAppEventFilter mFilter;
     QWidget mWindow;
     KSScrollViewerWidget* mList = nullptr;
-    QPointingDevice* mDevice;
+    TouchDevice& mDevice;
     QStringList log;
     bool answerWillFlick = true;
 

@@ -1,13 +1,5 @@
 #include "ScrollViewerTest.h"
 
-void ScrollViewerTest::initTestCase()
-{
-    m_device = QTest::createTouchDevice();
-    m_device->setParent(this);
-    m_other = QTest::createTouchDevice();
-    m_other->setParent(this);
-}
-
 void ScrollViewerTest::init()
 {
     m = std::make_unique<ScrollViewerFixture>(m_device);

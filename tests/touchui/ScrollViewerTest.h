@@ -1,8 +1,8 @@
 #pragma once
 
 #include "ScrollViewerFixture.h"
+#include "TouchDevice.h"
 
-#include <QPointingDevice>
 #include <QTest>
 
 #include <memory>
@@ -14,14 +14,13 @@ class ScrollViewerTest : public QObject
     Q_OBJECT
 
 private Q_SLOTS:
-    void initTestCase();
     void init();
     void cleanup();
 
 protected:
     void lift(int row);
 
-    QPointingDevice* m_device = nullptr;
-    QPointingDevice* m_other = nullptr; // another touch screen
+    TouchDevice m_device;
+    TouchDevice m_other; // another touch screen
     std::unique_ptr<ScrollViewerFixture> m;
 };

@@ -1,6 +1,6 @@
 #pragma once
 
-#include "Taps.h"
+#include "TouchDevice.h"
 
 #include "touchui/KSAppEventFilter.h"
 
@@ -16,12 +16,11 @@
 class TouchFixture
 {
 public:
-    TouchFixture() : filter(std::make_unique<KSAppEventFilter>()), m_device(QTest::createTouchDevice())
+    TouchFixture() : filter(std::make_unique<KSAppEventFilter>())
     {
         filter->registerLockObject(filter.get(), nullptr, LOCKOBJECT_DEFAULTMUTEX, nullptr);
         QCoreApplication::instance()->installEventFilter(filter.get());
     }
-    ~TouchFixture() { delete m_device; }
 
     void press(QWidget* widget, const QPoint& position, int finger = 0) const
     {
@@ -35,7 +34,7 @@ public:
     {
         QTest::touchEvent(widget, m_device).release(finger, position, widget);
     }
-    void tap(QWidget* widget, const QPoint& position) const { tapOnce(widget, m_device, position); }
+    void tap(QWidget* widget, const QPoint& position) const { m_device.tap(widget, position); }
     void cancel(QWidget* widget) const
     {
         QTouchEvent event(QEvent::TouchCancel, m_device);
@@ -47,5 +46,5 @@ public:
     std::unique_ptr<KSAppEventFilter> filter;
 
 private:
-    QPointingDevice* m_device;
+    TouchDevice m_device;
 };

@@ -1,13 +1,9 @@
 #include "TreeViewFixture.h"
 
-#include "Taps.h"
-
 void TreeViewFixture::initTestCase()
 {
     Q_INIT_RESOURCE(UILibrary);
     qRegisterMetaType<QLineEdit*>();
-    m_device = QTest::createTouchDevice();
-    m_device->setParent(this);
 }
 
 void TreeViewFixture::init()
@@ -38,7 +34,7 @@ void TreeViewFixture::cleanup()
 
 void TreeViewFixture::touchTap(const QPoint& point)
 {
-    tapOnce(m_area, m_device, point);
+    m_device.tap(m_area, point);
 }
 
 // Leaves the finger up. The list lags behind the finger, so it glides.

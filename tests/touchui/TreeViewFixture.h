@@ -1,5 +1,6 @@
 #pragma once
 
+#include "TouchDevice.h"
 #include "TreeFixture.h"
 
 #include "touchui/CustomTreeDelegete.h"
@@ -12,7 +13,6 @@
 
 #include <QApplication>
 #include <QLineEdit>
-#include <QPointingDevice>
 #include <QSignalSpy>
 #include <QTest>
 #include <QVBoxLayout>
@@ -61,7 +61,7 @@ protected:
     void swipe(const QPoint& from, int distance, int steps);
     QImage shot();
 
-    QPointingDevice* m_device = nullptr;
+    TouchDevice m_device;
     std::unique_ptr<KSAppEventFilter> m_filter;
     std::unique_ptr<SelfEndingSource> m_source;
     std::unique_ptr<KSTreeModel> m_model;

@@ -1,4 +1,5 @@
 // Who may hold the touch: the lock kinds, the filter that asks them, and the lock between processes.
+#include "TouchDevice.h"
 #include "tests/fakes/FakeTitlerAPPEventFilterController.h"
 #include "tests/fakes/ManualClock.h"
 #include "touchui/KSAppEventFilter.h"
@@ -64,7 +65,6 @@ class tst_ksappeventfilter : public QObject
     Q_OBJECT
 
 private Q_SLOTS:
-    void initTestCase();
     void init();
     void cleanup();
 
@@ -104,7 +104,7 @@ private:
     void touch(TouchEventButton* button, int id);
     void lift(TouchEventButton* button, int id);
 
-    QPointingDevice* m_device = nullptr;
+    TouchDevice m_device;
     std::unique_ptr<KSAppEventFilter> m_filter;
     std::unique_ptr<FakeTitlerAPPEventFilterController> m_controller;
     std::unique_ptr<QWidget> m_window;
@@ -113,12 +113,6 @@ private:
     std::unique_ptr<KSLockObject> m_forced;
     std::unique_ptr<QDialog> m_dialog;
 };
-
-void tst_ksappeventfilter::initTestCase()
-{
-    m_device = QTest::createTouchDevice();
-    m_device->setParent(this);
-}
 
 void tst_ksappeventfilter::init()
 {

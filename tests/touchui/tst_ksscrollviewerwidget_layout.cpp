@@ -1,6 +1,7 @@
 // Rows of a list, their order and places, the list's scroll bar, wheel and keys; what a row is made of.
 #include "ScrollViewerFixture.h"
 
+#include "TouchDevice.h"
 #include "touchui/KSScrollBar.h"
 
 #include <QGraphicsEffect>
@@ -64,15 +65,13 @@ private Q_SLOTS:
 private:
     void wheel(int delta);
 
-    QPointingDevice* m_device = nullptr;
+    TouchDevice m_device;
     std::unique_ptr<ScrollViewerFixture> m;
 };
 
 void tst_ksscrollviewerwidget_layout::initTestCase()
 {
     Q_INIT_RESOURCE(UILibrary);
-    m_device = QTest::createTouchDevice();
-    m_device->setParent(this);
 }
 
 void tst_ksscrollviewerwidget_layout::init()

@@ -1,6 +1,8 @@
 // Rows of a list whose widgets are made when they come into view, and taken away again.
 #include "ScrollViewerFixture.h"
 
+#include "TouchDevice.h"
+
 #include <QSignalSpy>
 
 #include <vector>
@@ -63,7 +65,7 @@ private:
     }
     QString firstName() { return m->mList->getWidgetItem(m->mList->firstVisibleItem())->objectName(); }
 
-    QPointingDevice* m_device = nullptr;
+    TouchDevice m_device;
     QStringList m_made;
     std::unique_ptr<ScrollViewerFixture> m;
 };
@@ -71,8 +73,6 @@ private:
 void tst_ksscrollviewerwidget_rows::initTestCase()
 {
     Q_INIT_RESOURCE(UILibrary);
-    m_device = QTest::createTouchDevice();
-    m_device->setParent(this);
 }
 
 void tst_ksscrollviewerwidget_rows::init()

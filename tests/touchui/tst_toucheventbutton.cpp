@@ -1,9 +1,9 @@
 // Buttons under the finger: real touch sequences through the window system.
+#include "TouchDevice.h"
 #include "touchui/KSPushbutton.h"
 #include "touchui/TouchEventButton.h"
 
 #include <QImage>
-#include <QPointingDevice>
 #include <QSignalSpy>
 #include <QTest>
 #include <QTouchEvent>
@@ -90,7 +90,7 @@ private Q_SLOTS:
     void textIsReadable();
 
 private:
-    QPointingDevice* m_device = nullptr;
+    TouchDevice m_device;
     std::unique_ptr<QWidget> m_window;
     RecordingButton* m_button = nullptr;
 };
@@ -98,8 +98,6 @@ private:
 void tst_toucheventbutton::initTestCase()
 {
     Q_INIT_RESOURCE(TitlerToolResource);
-    m_device = QTest::createTouchDevice();
-    m_device->setParent(this);
 }
 
 void tst_toucheventbutton::init()
