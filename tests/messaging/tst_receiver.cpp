@@ -9,7 +9,7 @@
 #include "messaging/ptc/QtReceiverEvent.h"
 #include "messaging/ptc/RemoteReceiver.h"
 #include "messaging/ptc/RemoteSender.h"
-#include "tests/fakes/RecordingAdapter.h"
+#include "tests/messaging/RecordingAdapter.h"
 
 #include <QCoreApplication>
 #include <QTest>

@@ -5,7 +5,7 @@
 #include "messaging/ptc/SocketFrame.h"
 #include "messaging/ptc/SocketRemoteReceiver.h"
 #include "messaging/ptc/SocketRemoteSender.h"
-#include "tests/fakes/RecordingAdapter.h"
+#include "tests/messaging/RecordingAdapter.h"
 #include "tests/messaging/TestPorts.h"
 #include "tests/messaging/TestSocket.h"
 #include "tests/support/RandomSeed.h"
