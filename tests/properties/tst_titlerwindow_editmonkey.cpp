@@ -21,7 +21,6 @@
 #include <QTemporaryDir>
 
 using MonkeyGround::heldLocks;
-using MonkeyGround::number;
 
 namespace
 {
