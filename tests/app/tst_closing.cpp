@@ -1,6 +1,7 @@
 // The end of a session in every state that it may be in, by every way to end it: what the operator saw is on
 // disk, whole and nothing beside it.
 #include "../library/LibraryFixture.h"
+#include "../support/Patience.h"
 #include "RecordingCallBack.h"
 #include "Siblings.h"
 #include "app/APPEventFilter.h"
@@ -30,11 +31,9 @@
 namespace
 {
 
-constexpr int ROW = 143;           // of the list, with the gap
-constexpr int HANDLE_X = 523;      // in the list
-constexpr int PICTURE_X = 150;     // likewise
-constexpr int LIFT_TIMEOUT = 5000; // ms
-constexpr int REPORT_TIMEOUT = 5000;
+constexpr int ROW = 143;       // of the list, with the gap
+constexpr int HANDLE_X = 523;  // in the list
+constexpr int PICTURE_X = 150; // likewise
 const long FILE_MANAGER = 36;
 const long UPDATE_TITLER_STATUS = 72;
 const char* const PICTURES[] = {"_1920.png", "_960.png", "_240.png", "_240S.png"};
@@ -253,7 +252,7 @@ void tst_Closing::closeOverTheQuestion()
 void tst_Closing::begin(Ending ending)
 {
     mWindow->showTitlerWindow({_titler_paramter::CREATE_OR_EDIT, mFolder.toStdWString()});
-    QVERIFY(QTest::qWaitForWindowActive(mWindow.get()));
+    QVERIFY(QTest::qWaitForWindowActive(mWindow.get(), PATIENCE_MS));
     QTRY_VERIFY(list()->archiveItem(2) && list()->archiveItem(2)->hasChildWidgets());
     QCOMPARE(stems(), mOrder);
     EditContextController* context = EditContextController::getInstance();
@@ -286,7 +285,7 @@ void tst_Closing::verifyReports()
         }
         return stems.contains(QSet<QString>(mChanged.cbegin(), mChanged.cend()));
     };
-    const QDeadlineTimer limit(REPORT_TIMEOUT);
+    const QDeadlineTimer limit(PATIENCE_MS);
     while (!reported() && !limit.hasExpired())
         QThread::msleep(5);
     QVERIFY(reported());
@@ -360,7 +359,7 @@ void tst_Closing::enter(State state)
         break;
     case MenuOpen:
         finger(QEventPoint::Pressed, list(), QPoint(PICTURE_X, ROW + 60));
-        QTRY_VERIFY_WITH_TIMEOUT(list()->IsOptionMenuShowing(), LIFT_TIMEOUT);
+        QTRY_VERIFY(list()->IsOptionMenuShowing());
         break;
     case PicturesOnTheirWay:
         for (int row = 0; row < list()->count(); ++row) {
@@ -457,7 +456,7 @@ void tst_Closing::carryTitle()
 {
     mWindow->editAndDoneButtonClicked();
     finger(QEventPoint::Pressed, list(), QPoint(HANDLE_X, 65));
-    QTRY_VERIFY_WITH_TIMEOUT(list()->getMoveState(), LIFT_TIMEOUT);
+    QTRY_VERIFY(list()->getMoveState());
     for (int step = 1; step <= 8; ++step)
         finger(QEventPoint::Updated, list(), QPoint(HANDLE_X, 65 + ROW * step / 8));
     mOrder.move(0, 1);

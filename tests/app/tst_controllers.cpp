@@ -1,4 +1,5 @@
 // The controllers against siblings that record: hand-shake, requests, notices and their filters.
+#include "../support/Patience.h"
 #include "Siblings.h"
 #include "app/EarlyRequests.h"
 #include "app/EditTitlerController.h"

@@ -115,4 +115,5 @@ void tst_EarlyRequests::unknownHandShakes()
 }
 
 QTEST_GUILESS_MAIN(tst_EarlyRequests)
+#include "../support/Patience.h"
 #include "tst_earlyrequests.moc"

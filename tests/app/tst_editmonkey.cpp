@@ -2,6 +2,7 @@
 // TITLER_TOUCHES changes its length: a hundred thousand take some minutes.
 #include "../canvas/StyleProperties.h"
 #include "../library/LibraryFixture.h"
+#include "../support/Patience.h"
 #include "CanvasFingers.h"
 #include "MonkeyGround.h"
 #include "Siblings.h"
@@ -176,7 +177,7 @@ void tst_editmonkey::manyTouches()
     const QString folder = writeFolder();
     const QString path = folder + "/title.xml";
     mWindow->showTitlerWindow({_titler_paramter::CREATE_OR_EDIT, path.toStdWString()});
-    QVERIFY(QTest::qWaitForWindowExposed(mWindow));
+    QVERIFY(QTest::qWaitForWindowExposed(mWindow, PATIENCE_MS));
     QCOMPARE(scene()->getTextItemList().size(), 2);
     MonkeyGround::Application::instance()->frozen = true;
     QElapsedTimer clock;

@@ -5,6 +5,7 @@
 //
 // TITLER_PROPERTY_STEPS and TITLER_PROPERTY_SEED change the length and the course.
 #include "../library/TemplateFixture.h"
+#include "../support/Patience.h"
 #include "LibraryModel.h"
 #include "Siblings.h"
 #include "app/APPEventFilter.h"
@@ -642,7 +643,7 @@ bool tst_LibraryProperty::closeAndReopen()
 
 bool tst_LibraryProperty::waitForPictures()
 {
-    CHECK(QTest::qWaitFor([this] { return mScene->isEditFinish(); }, 60000));
+    CHECK(QTest::qWaitFor([this] { return mScene->isEditFinish(); }, PATIENCE_MS));
     return true;
 }
 
@@ -765,7 +766,7 @@ bool tst_LibraryProperty::verifyPictures()
 bool tst_LibraryProperty::verifyNotices()
 {
     const QSet<QString> wanted(mModel.order.begin(), mModel.order.end());
-    const bool agree = QTest::qWaitFor([this, &wanted] { return toldTitles() == wanted; }, 20000);
+    const bool agree = QTest::qWaitFor([this, &wanted] { return toldTitles() == wanted; }, PATIENCE_MS);
     CHECK(agree);
     return true;
 }

@@ -1,6 +1,7 @@
 // The window and its template picker: how the dialog opens and closes, and what reaches it from list,
 // siblings and language.
 #include "../library/TemplateFixture.h"
+#include "../support/Patience.h"
 #include "Siblings.h"
 #include "app/APPEventFilter.h"
 #include "app/EditContextController.h"

@@ -1,6 +1,7 @@
 // The main window against siblings that only listen: layout, requests, closing, masks, move mode, language.
 #include "../library/LibraryFixture.h"
 #include "../support/LogFixture.h"
+#include "../support/Patience.h"
 #include "Siblings.h"
 #include "app/APPEventFilter.h"
 #include "app/EditContextController.h"
@@ -314,7 +315,7 @@ void tst_titler_window::closeWhileFingersRestOnTitles()
     const QPoint onClose = close->mapTo(mWindow, close->rect().center());
     for (int session = 0; session < 4; ++session) {
         request(folder);
-        QVERIFY(QTest::qWaitForWindowExposed(mWindow));
+        QVERIFY(QTest::qWaitForWindowExposed(mWindow, PATIENCE_MS));
         QCOMPARE(list()->count(), 5);
         const QPointer<ArchiveItem> item = list()->archiveItem(0);
         QWindow* window = mWindow->windowHandle();
@@ -404,7 +405,7 @@ void tst_titler_window::focusCommandLeavesACleanStackClean()
 void tst_titler_window::moveModeEatsPressesOutsideTheList()
 {
     request(writeFolder("moving", {"t1"}));
-    QVERIFY(QTest::qWaitForWindowExposed(mWindow));
+    QVERIFY(QTest::qWaitForWindowExposed(mWindow, PATIENCE_MS));
     KSPushbutton* move = nullptr;
     for (KSPushbutton* button : mWindow->findChildren<KSPushbutton*>()) {
         if (button->text() == "Move")

@@ -2,6 +2,7 @@
 // list, canvas and panel, move mode, and each of its dialogs.
 #include "../gallery/Interruptions.h"
 #include "../library/TemplateFixture.h"
+#include "../support/Patience.h"
 #include "Siblings.h"
 #include "app/EditContextController.h"
 #include "app/TitlerWindow.h"
@@ -69,7 +70,7 @@ void tst_TitlerWindowInterruptions::initTestCase()
     pMainWindow = mWindow;
     mWindow->setRealClose(false);
     mWindow->showTitlerWindow({_titler_paramter::CREATE_OR_EDIT, folder.toStdWString()});
-    QVERIFY(QTest::qWaitForWindowExposed(mWindow));
+    QVERIFY(QTest::qWaitForWindowExposed(mWindow, PATIENCE_MS));
     const auto* list = mWindow->findChild<ArchiveList*>();
     QTRY_COMPARE(list->count(), 12);
     QTRY_VERIFY(list->archiveItem(11)->hasChildWidgets());

@@ -1,5 +1,6 @@
 // A composition of an input method that is under way when the operator leaves the text for something else.
 #include "../library/LibraryFixture.h"
+#include "../support/Patience.h"
 #include "Siblings.h"
 #include "app/APPEventFilter.h"
 #include "app/TitlerWindow.h"
@@ -71,7 +72,7 @@ void tst_TitlerWindow_Composition::init()
     mFolder = mFixture.makeFolder(QStringLiteral("composition"));
     LibraryFixture::fillFolder(mFolder, {"a", "b"});
     mWindow->showTitlerWindow({_titler_paramter::CREATE_OR_EDIT, mFolder.toStdWString()});
-    QVERIFY(QTest::qWaitForWindowActive(mWindow.get()));
+    QVERIFY(QTest::qWaitForWindowActive(mWindow.get(), PATIENCE_MS));
     QTRY_VERIFY(list()->archiveItem(1) && list()->archiveItem(1)->hasChildWidgets());
 }
 

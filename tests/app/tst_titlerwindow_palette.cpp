@@ -1,6 +1,7 @@
 // A colour that is only previewed, whatever happens while the palette is open: every character gets its own
 // colour back, and neither the file, the style for the next run nor a new text learns of the preview.
 #include "../library/LibraryFixture.h"
+#include "../support/Patience.h"
 #include "../touchui/Taps.h"
 #include "Siblings.h"
 #include "app/APPEventFilter.h"
@@ -147,7 +148,7 @@ void tst_TitlerWindowPalette::init()
     LibraryFixture::writeOrder(mFolder, {QStringLiteral("a"), QStringLiteral("b")});
 
     mWindow->showTitlerWindow({_titler_paramter::CREATE_OR_EDIT, mFolder.toStdWString()});
-    QVERIFY(QTest::qWaitForWindowActive(mWindow.get()));
+    QVERIFY(QTest::qWaitForWindowActive(mWindow.get(), PATIENCE_MS));
     QTRY_VERIFY(find<ArchiveList>()->archiveItem(1) &&
                 find<ArchiveList>()->archiveItem(1)->hasChildWidgets());
     QCOMPARE(scene()->getTextItemList().size(), 2);

@@ -1,6 +1,7 @@
 // The texts of a title on all the ways that an operator goes away from them: nothing blank is saved, an
 // emptied title is, the soft keyboard is put away; and what a new text looks like.
 #include "../library/LibraryFixture.h"
+#include "../support/Patience.h"
 #include "../touchui/Taps.h"
 #include "RecordingCallBack.h"
 #include "Siblings.h"
@@ -200,7 +201,7 @@ void tst_TitlerWindow_Texts::init()
 void tst_TitlerWindow_Texts::show()
 {
     mWindow->showTitlerWindow({_titler_paramter::CREATE_OR_EDIT, mFolder.toStdWString()});
-    QVERIFY(QTest::qWaitForWindowActive(mWindow.get()));
+    QVERIFY(QTest::qWaitForWindowActive(mWindow.get(), PATIENCE_MS));
     QTRY_VERIFY(list()->archiveItem(2) && list()->archiveItem(2)->hasChildWidgets());
     QCOMPARE(QFileInfo(list()->getSelectedArchive()->getArchiveDataPath()).completeBaseName(),
              QStringLiteral("a"));

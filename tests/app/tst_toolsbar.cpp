@@ -99,7 +99,7 @@ void TestToolsBar::init()
                          m_window.get());
     m_bar->setGeometry(0, 8, 1363, 67);
     m_window->show();
-    QVERIFY(QTest::qWaitForWindowExposed(m_window.get()));
+    QVERIFY(QTest::qWaitForWindowExposed(m_window.get(), PATIENCE_MS));
 }
 
 void TestToolsBar::cleanup()
@@ -122,7 +122,7 @@ QLabel* TestToolsBar::label(const char* name) const
 void TestToolsBar::openMenu()
 {
     QTest::mouseClick(button("Canvas"), Qt::LeftButton);
-    QVERIFY(QTest::qWaitForWindowExposed(menu()));
+    QVERIFY(QTest::qWaitForWindowExposed(menu(), PATIENCE_MS));
 }
 
 void TestToolsBar::layout()
@@ -395,7 +395,7 @@ void TestToolsBar::fingerThatOpenedTheMenuIsLifted()
     QTest::touchEvent(canvas, m_device).press(0, QPoint(60, 20));
     QVERIFY(!menu()->isVisible());
     QTest::touchEvent(canvas, m_device).move(0, QPoint(60, -200));
-    QVERIFY(QTest::qWaitForWindowExposed(menu()));
+    QVERIFY(QTest::qWaitForWindowExposed(menu(), PATIENCE_MS));
     QVERIFY(APPEventFilter::instance()->isLock(nullptr, LOCKMETHOD_TOUCH));
     QTest::touchEvent(canvas, m_device).release(0, QPoint(60, -200));
     QVERIFY(!APPEventFilter::instance()->isLock(nullptr, LOCKMETHOD_TOUCH));
@@ -504,4 +504,5 @@ int main(int argc, char** argv)
     return QTest::qExec(&test, argc, argv);
 }
 
+#include "../support/Patience.h"
 #include "tst_toolsbar.moc"

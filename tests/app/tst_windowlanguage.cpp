@@ -1,4 +1,5 @@
 // The language of the window with translations of which one is missing.
+#include "../support/Patience.h"
 #include "Siblings.h"
 #include "app/APPEventFilter.h"
 #include "app/TitlerWindow.h"
@@ -72,7 +73,7 @@ void tst_WindowLanguage::missingTranslationLeavesTheLanguage()
 void tst_WindowLanguage::listKeepsItsPlace()
 {
     mWindow->show();
-    QVERIFY(QTest::qWaitForWindowExposed(mWindow.get()));
+    QVERIFY(QTest::qWaitForWindowExposed(mWindow.get(), PATIENCE_MS));
     const auto* list = mWindow->findChild<ArchiveList*>();
     for (const auto language :
          {SystemSetupDef::emSystemLanguageEnglish, SystemSetupDef::emSystemLanguageChinese}) {

@@ -3,6 +3,7 @@
 // meanwhile. TITLER_SEED repeats a run, TITLER_TOUCHES changes its length: a hundred thousand take some
 // minutes.
 #include "../canvas/CanvasTestTools.h"
+#include "../support/Patience.h"
 #include "LibraryModel.h"
 #include "MonkeyGround.h"
 #include "OtherProcesses.h"
@@ -42,7 +43,6 @@ constexpr int TouchesPerFrame = 16;
 constexpr int TouchesPerGlance = 40; // at what is shown
 constexpr int TouchesPerLook = 1000; // at what is on disk
 constexpr int LooksPerPicture = 5;   // read the pictures, too
-constexpr int SaveTimeout = 60000;
 
 const char* const MustHappen[] = {"titles made",
                                   "titles pasted",
@@ -425,7 +425,7 @@ void tst_windowmonkey::manyTouches()
     QVERIFY2(held.isEmpty(), qPrintable(held + '\n' + mFingers->lastTouches().join('\n')));
 
     if (mWindow->isVisible()) {
-        QTRY_VERIFY_WITH_TIMEOUT(mWindow->dataSaveIsFinished(), SaveTimeout);
+        QTRY_VERIFY(mWindow->dataSaveIsFinished());
         mWindow->closeTitlerWindow();
         if (mWindow->isVisible())
             mWindow->continueCloseTitler({1, MessageDefine::CLOSE_OK, MessageDef::MESSAGE_CONFIRM_CLOSE});

@@ -1,6 +1,7 @@
 // A canvas with everything it needs, for tests: view, undo stack, messages, pictures.
 #pragma once
 
+#include "../support/Patience.h"
 #include "CanvasTestTools.h"
 
 #include "canvas/CanvasScene.h"
@@ -93,7 +94,7 @@ public:
     void show()
     {
         view.show();
-        QVERIFY(QTest::qWaitForWindowActive(&view));
+        QVERIFY(QTest::qWaitForWindowActive(&view, PATIENCE_MS));
     }
     void open(const QList<TText>& texts)
     {

@@ -1,5 +1,6 @@
 #pragma once
 
+#include "../support/Patience.h"
 #include "CanvasFixture.h"
 
 #include "tests/touchui/Taps.h"
@@ -36,7 +37,7 @@ public:
     void show()
     {
         window.show();
-        QVERIFY(QTest::qWaitForWindowActive(&window));
+        QVERIFY(QTest::qWaitForWindowActive(&window, PATIENCE_MS));
         view.setFocus();
     }
 

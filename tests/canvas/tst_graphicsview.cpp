@@ -77,7 +77,7 @@ void tst_graphicsview::init()
     m_view->setFrameStyle(0);
     m_view->resize(400, 300);
     m_view->show();
-    QVERIFY(QTest::qWaitForWindowExposed(m_view));
+    QVERIFY(QTest::qWaitForWindowExposed(m_view, PATIENCE_MS));
 }
 
 void tst_graphicsview::cleanup()
@@ -173,4 +173,5 @@ void tst_graphicsview::acceptsTouch()
 }
 
 QTEST_MAIN(tst_graphicsview)
+#include "../support/Patience.h"
 #include "tst_graphicsview.moc"

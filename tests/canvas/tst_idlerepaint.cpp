@@ -1,4 +1,5 @@
 // The canvas is repainted for a cause, and never while nothing happens.
+#include "../support/Patience.h"
 #include "CanvasFixture.h"
 
 #include <QAbstractEventDispatcher>

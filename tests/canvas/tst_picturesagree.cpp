@@ -1,3 +1,4 @@
+#include "../support/Patience.h"
 #include "CanvasFixture.h"
 #include "StyleProperties.h"
 
@@ -67,7 +68,7 @@ tst_picturesagree::Pictures tst_picturesagree::picturesOf(const QList<TText>& te
                      [&pictures](const QString&, const QImage& image) { pictures.list = image; });
     render.makeThumbnail(saved.get(), false);
     render.makeThumbnail(saved.get(), true);
-    if (QTest::qWaitFor([&render] { return render.makePictureThreadIsFinished(); }, 20000))
+    if (QTest::qWaitFor([&render] { return render.makePictureThreadIsFinished(); }, PATIENCE_MS))
         pictures.air = QImage(canvas.folder.path() + "/title_1920.png");
     return pictures;
 }

@@ -1,3 +1,4 @@
+#include "../support/Patience.h"
 #include "CanvasFixture.h"
 
 // What fingers, keys and the soft keyboard do to the objects of a canvas.
@@ -245,7 +246,7 @@ void tst_touchediting::longPressSelectsACharacter()
     canvas.tap(canvas.pointOn(1));
     QTest::mousePress(canvas.view.viewport(), Qt::LeftButton, {}, canvas.pointOn(1));
     QVERIFY(!item->textCursor().hasSelection());
-    QTRY_VERIFY_WITH_TIMEOUT(item->textCursor().hasSelection(), 5000);
+    QTRY_VERIFY(item->textCursor().hasSelection());
     QCOMPARE(item->textCursor().selectionEnd() - item->textCursor().selectionStart(), 1);
     QVERIFY(item->isHandleCaret());
     QTest::mouseRelease(canvas.view.viewport(), Qt::LeftButton, {}, canvas.pointOn(1));

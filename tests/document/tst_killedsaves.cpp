@@ -118,4 +118,5 @@ int main(int argc, char** argv)
     return QTest::qExec(&test, argc, argv);
 }
 
+#include "../support/Patience.h"
 #include "tst_killedsaves.moc"

@@ -1,5 +1,6 @@
 #pragma once
 
+#include "../support/Patience.h"
 #include "LibraryFixture.h"
 #include "tests/touchui/InputContextFixture.h"
 #include "tests/touchui/TouchFixture.h"
@@ -52,9 +53,9 @@ public:
         tree()->setHoldInterval(HOLD);
         picker->updateTreeView();
         picker->show();
-        QVERIFY(QTest::qWaitForWindowExposed(picker.get()));
+        QVERIFY(QTest::qWaitForWindowExposed(picker.get(), PATIENCE_MS));
         picker->activateWindow();
-        QVERIFY(QTest::qWaitForWindowActive(picker.get()));
+        QVERIFY(QTest::qWaitForWindowActive(picker.get(), PATIENCE_MS));
     }
 
     void close()

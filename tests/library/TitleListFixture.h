@@ -1,5 +1,6 @@
 #pragma once
 
+#include "../support/Patience.h"
 #include "LibraryFixture.h"
 
 #include "library/ArchiveItem.h"
@@ -49,7 +50,7 @@ public:
             canvas.append(archive ? QString::fromStdString(archive->getName()) : QStringLiteral("null"));
         });
         window.show();
-        if (!QTest::qWaitForWindowExposed(&window))
+        if (!QTest::qWaitForWindowExposed(&window, PATIENCE_MS))
             qFatal("no window");
     }
     ~TitleListFixture() override
@@ -64,10 +65,12 @@ public:
     void open(const QString& folder)
     {
         list->refreshArchiveList(folder);
-        const bool complete = QTest::qWaitFor([this] {
-            const ArchiveItem* last = item(list->count() - 1);
-            return !last || last->hasChildWidgets();
-        });
+        const bool complete = QTest::qWaitFor(
+            [this] {
+                const ArchiveItem* last = item(list->count() - 1);
+                return !last || last->hasChildWidgets();
+            },
+            PATIENCE_MS);
         if (!complete)
             qFatal("the titles have no pictures");
         canvas.clear();

@@ -1,4 +1,5 @@
 // Create, paste, delete, move and focus through an undo stack: list, order file, request and reports.
+#include "../support/Patience.h"
 #include "../support/SettledFolder.h"
 #include "LibraryFixture.h"
 
@@ -117,7 +118,7 @@ void tst_ArchiveCommands::init()
         mCanvas.append(archive ? QString::fromStdString(archive->getName()) : QStringLiteral("null"));
     });
     mList->show();
-    QVERIFY(QTest::qWaitForWindowExposed(mList.get()));
+    QVERIFY(QTest::qWaitForWindowExposed(mList.get(), PATIENCE_MS));
     mContext.createNew = false;
     mContext.files.clear();
     mCanvas.clear();

@@ -1,4 +1,5 @@
 // The title list on folders: opening, selecting, the option menu, limits, saves that come back.
+#include "../support/Patience.h"
 #include "LibraryFixture.h"
 
 #include "library/ArchiveItem.h"
@@ -124,7 +125,7 @@ void tst_ArchiveList::init()
         mCanvas.append(archive ? QString::fromStdString(archive->getName()) : QStringLiteral("null"));
     });
     mList->show();
-    QVERIFY(QTest::qWaitForWindowExposed(mList.get()));
+    QVERIFY(QTest::qWaitForWindowExposed(mList.get(), PATIENCE_MS));
     mContext.createNew = false;
     mFolders.take();
     mMessages.take();

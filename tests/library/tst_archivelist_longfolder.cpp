@@ -1,5 +1,6 @@
 // Folders of more titles than an operator can make: items come as they are looked at and go again, titles are
 // read by and by, and every operation does what it does in a short folder.
+#include "../support/Patience.h"
 #include "TitleListFixture.h"
 
 #include <QLabel>

@@ -1,5 +1,6 @@
 // What the file manager and other processes do to folders while the folder picker shows, while a name is
 // being typed in it, and while it is hidden.
+#include "../support/Patience.h"
 #include "FolderPickerFixture.h"
 
 #include <QLabel>

@@ -1,4 +1,5 @@
 // The folder picker under a finger: choosing, opening, making, copying and renaming folders.
+#include "../support/Patience.h"
 #include "FolderPickerFixture.h"
 
 #include <QLabel>

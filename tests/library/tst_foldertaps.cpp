@@ -1,6 +1,7 @@
 // What fingers do to the tree of the folder picker besides choosing a row: folders are opened and closed, the
 // header sorts. Which check comes first when a folder is opened in the editor. What the operator, the other
 // processes and the operation log are told.
+#include "../support/Patience.h"
 #include "FolderPickerFixture.h"
 #include "tests/support/LogFixture.h"
 #include "tests/touchui/ManualClock.h"

@@ -1,4 +1,5 @@
 // The threads that load a folder, write title files and open a picker.
+#include "../support/Patience.h"
 #include "LibraryFixture.h"
 
 #include "library/ArchiveInitThread.h"

@@ -1,4 +1,5 @@
 // The thread that writes a title's pictures: what it writes, when it counts as finished, what it drops.
+#include "../support/Patience.h"
 #include "../support/SettledFolder.h"
 #include "HoldingReporter.h"
 #include "LibraryFixture.h"
@@ -152,7 +153,7 @@ void tst_PictureThread::jobsAreWrittenInOrder()
         thread.addArchive(archive.get(), pictures(Qt::red));
         expected.append({1, stem});
     }
-    QTRY_VERIFY_WITH_TIMEOUT(thread.isThreadWaiting(), 30000);
+    QTRY_VERIFY(thread.isThreadWaiting());
     QCOMPARE(reports.take(), expected);
 }
 
@@ -203,7 +204,7 @@ void tst_PictureThread::namesOfTitlesAreNoPictures()
     if (isDeletedMeanwhile)
         QVERIFY(QFile::remove(folder + QStringLiteral("/t.xml")));
     reporter.goOn.release();
-    QTRY_VERIFY_WITH_TIMEOUT(thread.isThreadWaiting(), 20000);
+    QTRY_VERIFY(thread.isThreadWaiting());
     QVERIFY(!QFile::exists(folder + QStringLiteral("/other.XML")));
     QCOMPARE(LibraryFixture::order(folder), (QStringList{QStringLiteral("t"), QStringLiteral("other")}));
     Archive other;
@@ -236,7 +237,7 @@ void tst_PictureThread::deletedTitleKeepsNoPictures()
     if (!isBeingWritten)
         QVERIFY(QFile::remove(folder + QStringLiteral("/gone_240.png")));
     reporter.goOn.release(2);
-    QTRY_VERIFY_WITH_TIMEOUT(thread.isThreadWaiting(), 20000);
+    QTRY_VERIFY(thread.isThreadWaiting());
     QCOMPARE(QDir(folder).entryList(QDir::Files, QDir::Name),
              (QStringList{QStringLiteral("kept.xml"), QStringLiteral("kept_1920.png"),
                           QStringLiteral("kept_240.png"), QStringLiteral("kept_240S.png"),

@@ -1,6 +1,7 @@
 // What the template picker makes of the file manager's notices about template folders, told in each way a
 // path can be told, and what it writes to the logs.
 #include "../support/LogFixture.h"
+#include "../support/Patience.h"
 #include "TemplateFixture.h"
 
 #include "library/TemplateItem.h"
@@ -313,7 +314,7 @@ void tst_TemplateNotices::taps()
     mFixture.makePresets("templates_en", {"a", "b"});
     mPicker = std::make_unique<TemplatePicker>();
     mPicker->show();
-    QVERIFY(QTest::qWaitForWindowExposed(mPicker.get()));
+    QVERIFY(QTest::qWaitForWindowExposed(mPicker.get(), PATIENCE_MS));
     mLog.takeOperations();
     mPicker->presetTab()->item(1)->clickTriggered();
     mPicker->showUserTemplateTab();

@@ -1,4 +1,5 @@
 // The template picker under a finger, on folders.
+#include "../support/Patience.h"
 #include "TemplateFixture.h"
 #include "tests/touchui/Taps.h"
 #include "tests/touchui/TouchFixture.h"
@@ -682,7 +683,7 @@ private:
     void show()
     {
         mPicker->show();
-        QVERIFY(QTest::qWaitForWindowExposed(mPicker.get()));
+        QVERIFY(QTest::qWaitForWindowExposed(mPicker.get(), PATIENCE_MS));
     }
 
     void open()

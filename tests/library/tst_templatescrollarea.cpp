@@ -44,7 +44,7 @@ private Q_SLOTS:
         mArea->setFixedSize(460, 400);
         mArea->initTouch();
         mArea->show();
-        QVERIFY(QTest::qWaitForWindowExposed(mArea.get()));
+        QVERIFY(QTest::qWaitForWindowExposed(mArea.get(), PATIENCE_MS));
         QCOMPARE(mArea->verticalScrollBar()->maximum(), ROWS * BUTTON.height() - 400);
         mPressed = std::make_unique<QSignalSpy>(mArea.get(), &TemplateScrollArea::itemPressed);
     }
@@ -288,4 +288,5 @@ private:
 };
 
 QTEST_MAIN(TestTemplateScrollArea)
+#include "../support/Patience.h"
 #include "tst_templatescrollarea.moc"

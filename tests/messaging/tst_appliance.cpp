@@ -1,4 +1,5 @@
 // The appliance program, driven over its lines, with a titler on the messaging library as its client.
+#include "../support/Patience.h"
 #include "messaging/ptc/InstanceFactory.h"
 #include "messaging/ptc/Proxy.h"
 #include "messaging/ptc/QtReceiver.h"
@@ -237,7 +238,7 @@ QJsonObject TestAppliance::event(const QString& kind)
 
 void TestAppliance::expect(const QStringList& calls)
 {
-    QTRY_VERIFY_WITH_TIMEOUT(m_titler->calls.size() >= calls.size(), 20000);
+    QTRY_VERIFY(m_titler->calls.size() >= calls.size());
     QCOMPARE(m_titler->calls, calls);
     m_titler->calls.clear();
 }
@@ -506,7 +507,7 @@ void TestAppliance::titlerStartedAnew()
     command("create 1");
     expect({"create 1"});
     m_titler = std::make_unique<SmallTitler>();
-    QTRY_VERIFY_WITH_TIMEOUT(m_titler->initialize(), 20000);
+    QTRY_VERIFY(m_titler->initialize());
     auto* center = m_titler->service<IMessageCenter>(65);
     center->registerCallBack(m_titler.get());
     expect({"client id 1"});

@@ -1,4 +1,5 @@
 // Receivers, proxies, adapters and the factory, without sockets.
+#include "../support/Patience.h"
 #include "messaging/ptc/CallbackProxy.h"
 #include "messaging/ptc/Event.h"
 #include "messaging/ptc/EventPacket.h"

@@ -1,4 +1,5 @@
 // The sender to a process that does not read, does not accept, ends, or is started anew.
+#include "../support/Patience.h"
 #include "messaging/ptc/Event.h"
 #include "messaging/ptc/SocketFrame.h"
 #include "messaging/ptc/SocketRemoteSender.h"

@@ -1,4 +1,5 @@
 // The palette: its colours, what a choice, OK and Cancel send, and where a finger can move it.
+#include "../support/Patience.h"
 #include "PanelFixture.h"
 
 #include "panel/ColorButton.h"
@@ -52,7 +53,7 @@ void TestColorPalette::init()
     m_sent = std::make_unique<QSignalSpy>(m_palette.get(), &ColorPalette::sendColorValue);
     m_palette->move(100, 100);
     m_palette->show();
-    QVERIFY(QTest::qWaitForWindowExposed(m_palette.get()));
+    QVERIFY(QTest::qWaitForWindowExposed(m_palette.get(), PATIENCE_MS));
 }
 
 void TestColorPalette::cleanup()

@@ -1,4 +1,5 @@
 // The font box: which families it offers, under which names, and what it makes of imported files.
+#include "../support/Patience.h"
 #include "PanelFixture.h"
 
 #include "panel/FamilyToolBox.h"
@@ -64,7 +65,7 @@ void TestFontBox::init()
     m_box = new FamilyToolBox(m_window.get());
     m_box->move(20, 700);
     m_window->show();
-    QVERIFY(QTest::qWaitForWindowActive(m_window.get()));
+    QVERIFY(QTest::qWaitForWindowActive(m_window.get(), PATIENCE_MS));
 }
 
 void TestFontBox::cleanup()

@@ -1,4 +1,5 @@
 // The size box: its list, its ladder from mixed selections, and what becomes of what is typed in it.
+#include "../support/Patience.h"
 #include "PanelFixture.h"
 
 #include "panel/ComboxLineEditRegExpValidator.h"
@@ -87,7 +88,7 @@ void TestSizeBox::init()
     m_box->setWidgetDisabled();
     m_box->setWidgetEnabled();
     m_window->show();
-    QVERIFY(QTest::qWaitForWindowActive(m_window.get()));
+    QVERIFY(QTest::qWaitForWindowActive(m_window.get(), PATIENCE_MS));
     m_environment->messages.posted.clear();
 }
 

@@ -1,4 +1,5 @@
 // The size box and the soft keyboard: asked for by a tap into the field, and put away by whatever leaves it.
+#include "../support/Patience.h"
 #include "PanelFixture.h"
 
 #include "panel/SizeBoxLineEdit.h"
@@ -68,7 +69,7 @@ void TestSizeToolBoxKeyboard::init()
     m_box->setFontSize({64, 64});
     m_other = new QLineEdit(m_window.get());
     m_window->show();
-    QVERIFY(QTest::qWaitForWindowActive(m_window.get()));
+    QVERIFY(QTest::qWaitForWindowActive(m_window.get(), PATIENCE_MS));
     m_service.calls.clear();
     m_service.shown.clear();
 }

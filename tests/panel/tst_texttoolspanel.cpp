@@ -1,4 +1,5 @@
 // The panel as a whole: what reaches the canvas and the log, what a selection shows, who is enabled when.
+#include "../support/Patience.h"
 #include "PanelFixture.h"
 
 #include "document/SettingManager.h"
@@ -75,7 +76,7 @@ void TestTextToolsPanel::init()
     QFile::remove(QString::fromStdWString(IPathManagerEx::getInstance()->getSystemSettingPath()) +
                   QString::fromLatin1(SettingManager::SETTING_FILENAME));
     m_panel = std::make_unique<Panel>(*m_environment);
-    QVERIFY(QTest::qWaitForWindowActive(&m_panel->window));
+    QVERIFY(QTest::qWaitForWindowActive(&m_panel->window, PATIENCE_MS));
 }
 
 void TestTextToolsPanel::cleanup()

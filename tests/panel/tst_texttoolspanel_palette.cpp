@@ -1,4 +1,5 @@
 // The panel's palette: what a chosen colour sends, what Cancel gives back, and what cancels it by itself.
+#include "../support/Patience.h"
 #include "PanelFixture.h"
 
 #include "panel/ColorButton.h"
@@ -32,7 +33,7 @@ private:
 void TestTextToolsPanelPalette::init()
 {
     m_panel = std::make_unique<Panel>(*m_environment);
-    QVERIFY(QTest::qWaitForWindowActive(&m_panel->window));
+    QVERIFY(QTest::qWaitForWindowActive(&m_panel->window, PATIENCE_MS));
 }
 
 void TestTextToolsPanelPalette::textPaletteOk()

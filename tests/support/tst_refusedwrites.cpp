@@ -225,4 +225,5 @@ private:
 };
 
 QTEST_GUILESS_MAIN(tst_RefusedWrites)
+#include "Patience.h"
 #include "tst_refusedwrites.moc"

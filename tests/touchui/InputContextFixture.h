@@ -1,5 +1,6 @@
 #pragma once
 
+#include "../support/Patience.h"
 #include "messaging/services/SubCommonDefine.h"
 #include "tests/touchui/FakeInputMethod.h"
 #include "tests/touchui/FakeService.h"
@@ -132,7 +133,7 @@ inline void InputContextFixture::init()
     }
     m_window->show();
     m_window->activateWindow();
-    QVERIFY(QTest::qWaitForWindowActive(m_window.get()));
+    QVERIFY(QTest::qWaitForWindowActive(m_window.get(), PATIENCE_MS));
     m_button->setFocus();
     m_service->calls.clear();
 }

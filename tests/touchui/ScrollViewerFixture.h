@@ -1,5 +1,6 @@
 #pragma once
 
+#include "../support/Patience.h"
 #include "ManualClock.h"
 #include "touchui/KSAppEventFilter.h"
 #include "touchui/KSBaseItemWidget.h"
@@ -56,7 +57,7 @@ public:
         KSScrollViewerWidget::s_mainWnd = &mWindow;
         record();
         mWindow.show();
-        if (!QTest::qWaitForWindowExposed(&mWindow))
+        if (!QTest::qWaitForWindowExposed(&mWindow, PATIENCE_MS))
             qFatal("no window");
     }
     ~ScrollViewerFixture() override

@@ -53,7 +53,7 @@ void TestBalloons::init()
     m_anchor = new QWidget(m_window.get());
     m_anchor->setGeometry(300, 300, 100, 50);
     m_window->show();
-    QVERIFY(QTest::qWaitForWindowExposed(m_window.get()));
+    QVERIFY(QTest::qWaitForWindowExposed(m_window.get(), PATIENCE_MS));
     KSToolTip::s_mainWindow = m_window.get();
     Balloon::s_ParentWindow = m_window.get();
 }
@@ -206,4 +206,5 @@ void TestBalloons::balloonWithoutWidget()
 }
 
 QTEST_MAIN(TestBalloons)
+#include "../support/Patience.h"
 #include "tst_balloons.moc"

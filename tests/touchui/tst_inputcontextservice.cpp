@@ -1,4 +1,5 @@
 // What the soft keyboard service sends to fields.
+#include "../support/Patience.h"
 #include "support/LogManager.h"
 #include "tests/support/LogFixture.h"
 #include "tests/touchui/InputContextFixture.h"

@@ -262,4 +262,5 @@ int main(int argc, char** argv)
     return windowManager.waitForFinished() ? result : EXIT_FAILURE;
 }
 
+#include "../support/Patience.h"
 #include "tst_inputcontextx11.moc"

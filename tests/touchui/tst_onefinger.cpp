@@ -1,4 +1,5 @@
 // One finger on a widget: what it makes of touch events, and everything that takes the finger away.
+#include "../support/Patience.h"
 #include "ManualClock.h"
 #include "TouchFixture.h"
 
@@ -63,7 +64,7 @@ private Q_SLOTS:
         mTouch = std::make_unique<TouchFixture>();
         mPad = std::make_unique<Pad>();
         mPad->show();
-        QVERIFY(QTest::qWaitForWindowExposed(mPad.get()));
+        QVERIFY(QTest::qWaitForWindowExposed(mPad.get(), PATIENCE_MS));
         mCancelled = std::make_unique<QSignalSpy>(&mPad->finger, &OneFinger::cancelled);
     }
     void cleanup()

@@ -1,4 +1,5 @@
 // Rows of a list, their order and places, the list's scroll bar, wheel and keys; what a row is made of.
+#include "../support/Patience.h"
 #include "ScrollViewerFixture.h"
 
 #include "touchui/KSScrollBar.h"
@@ -283,7 +284,7 @@ void TestScrollViewerLayout::barStaysInItsPlace()
     scroll(300);
     QCOMPARE(m->mList->getVScrollBar()->geometry(), place);
     m->mWindow.show();
-    QVERIFY(QTest::qWaitForWindowExposed(&m->mWindow));
+    QVERIFY(QTest::qWaitForWindowExposed(&m->mWindow, PATIENCE_MS));
     QCOMPARE(m->mList->getVScrollBar()->geometry(), place);
     m->mList->setUpdatesEnabled(false);
     scroll(m->maximum());

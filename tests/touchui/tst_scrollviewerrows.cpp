@@ -1,4 +1,5 @@
 // Rows of a list whose widgets are made when they come into view, and taken away again.
+#include "../support/Patience.h"
 #include "ScrollViewerFixture.h"
 
 #include <QSignalSpy>

@@ -109,7 +109,7 @@ void TestTouchButtons::init()
     m_button = new RecordingButton(QStringLiteral("One"), m_window.get());
     m_button->setGeometry(100, 100, 120, 60);
     m_window->show();
-    QVERIFY(QTest::qWaitForWindowExposed(m_window.get()));
+    QVERIFY(QTest::qWaitForWindowExposed(m_window.get(), PATIENCE_MS));
 }
 
 void TestTouchButtons::cleanup()
@@ -377,4 +377,5 @@ void TestTouchButtons::textIsReadable()
 }
 
 QTEST_MAIN(TestTouchButtons)
+#include "../support/Patience.h"
 #include "tst_touchbuttons.moc"

@@ -1,4 +1,5 @@
 // Editors, check boxes and marks in the rows of the touch tree, and what it paints.
+#include "../support/Patience.h"
 #include "TreeViewFixture.h"
 
 class TestTreeEditing : public TreeViewFixture

@@ -31,7 +31,7 @@ void tst_WindowPlaceKeeper::init()
     new WindowPlaceKeeper(mDialog.get());
     mDialog->move(60, 40);
     mDialog->show();
-    QVERIFY(QTest::qWaitForWindowExposed(mDialog.get()));
+    QVERIFY(QTest::qWaitForWindowExposed(mDialog.get(), PATIENCE_MS));
     QCOMPARE(mDialog->windowHandle()->position(), QPoint(60, 40));
 }
 
@@ -78,4 +78,5 @@ void tst_WindowPlaceKeeper::doesNotQuarrel()
 }
 
 QTEST_MAIN(tst_WindowPlaceKeeper)
+#include "../support/Patience.h"
 #include "tst_windowplacekeeper.moc"
