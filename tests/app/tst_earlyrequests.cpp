@@ -1,4 +1,5 @@
 // Requests that come before the hand-shakes are through.
+#include "../support/Patience.h"
 #include "app/EarlyRequests.h"
 
 #include <QEventLoop>
@@ -115,5 +116,4 @@ void tst_EarlyRequests::unknownHandShakes()
 }
 
 QTEST_GUILESS_MAIN(tst_EarlyRequests)
-#include "../support/Patience.h"
 #include "tst_earlyrequests.moc"

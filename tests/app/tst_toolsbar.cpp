@@ -1,4 +1,5 @@
 // The row of buttons above the canvas: taps, looks, enabling and the Canvas menu.
+#include "../support/Patience.h"
 #include "app/APPEventFilter.h"
 #include "app/ToolsBar.h"
 #include "touchui/KSPushbutton.h"
@@ -504,5 +505,4 @@ int main(int argc, char** argv)
     return QTest::qExec(&test, argc, argv);
 }
 
-#include "../support/Patience.h"
 #include "tst_toolsbar.moc"

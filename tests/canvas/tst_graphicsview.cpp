@@ -1,3 +1,4 @@
+#include "../support/Patience.h"
 #include "canvas/GraphicsView.h"
 
 #include <QApplication>
@@ -173,5 +174,4 @@ void tst_graphicsview::acceptsTouch()
 }
 
 QTEST_MAIN(tst_graphicsview)
-#include "../support/Patience.h"
 #include "tst_graphicsview.moc"

@@ -1,5 +1,6 @@
 // A process that is killed while it saves leaves whole files; readers beside it see only whole files; the
 // next start finds no trace.
+#include "../support/Patience.h"
 #include "document/Archive.h"
 #include "document/ArchiveManager.h"
 #include "document/PngWriter.h"
@@ -118,5 +119,4 @@ int main(int argc, char** argv)
     return QTest::qExec(&test, argc, argv);
 }
 
-#include "../support/Patience.h"
 #include "tst_killedsaves.moc"

@@ -1,4 +1,5 @@
 // One finger on a grid of buttons: taps, drags, flicks, and what further fingers may not do.
+#include "../support/Patience.h"
 #include "library/TemplateScrollArea.h"
 
 #include <QGridLayout>
@@ -288,5 +289,4 @@ private:
 };
 
 QTEST_MAIN(TestTemplateScrollArea)
-#include "../support/Patience.h"
 #include "tst_templatescrollarea.moc"

@@ -1,5 +1,6 @@
 // The designs that new titles begin with: the same in both languages, legible over any picture, within the
 // title-safe area.
+#include "../support/Patience.h"
 #include "appliance/PresetTemplates.h"
 #include "appliance/SampleText.h"
 #include "document/TText.h"
@@ -294,5 +295,4 @@ void TestPresetTemplates::textIsSafeAndLegible()
 }
 
 QTEST_MAIN(TestPresetTemplates)
-#include "../support/Patience.h"
 #include "tst_presettemplates.moc"

@@ -1,4 +1,5 @@
 // The balloons: the tool tip of sliders and rows, and those of buttons and prompts.
+#include "../support/Patience.h"
 #include "touchui/Balloon.h"
 #include "touchui/BalloonWindow.h"
 #include "touchui/KSToolTip.h"
@@ -206,5 +207,4 @@ void TestBalloons::balloonWithoutWidget()
 }
 
 QTEST_MAIN(TestBalloons)
-#include "../support/Patience.h"
 #include "tst_balloons.moc"

@@ -1,4 +1,5 @@
 // The input context on an X server: keys that really come from one. Run under Xvfb.
+#include "../support/Patience.h"
 #include "messaging/services/ISoftKeyBoardController.h"
 #include "touchui/KSAppEventFilter.h"
 #include "touchui/KSInputContext.h"
@@ -262,5 +263,4 @@ int main(int argc, char** argv)
     return windowManager.waitForFinished() ? result : EXIT_FAILURE;
 }
 
-#include "../support/Patience.h"
 #include "tst_inputcontextx11.moc"

@@ -1,4 +1,5 @@
 // Buttons under the finger: real touch sequences through the window system.
+#include "../support/Patience.h"
 #include "touchui/KSPushbutton.h"
 #include "touchui/TouchEventButton.h"
 
@@ -377,5 +378,4 @@ void TestTouchButtons::textIsReadable()
 }
 
 QTEST_MAIN(TestTouchButtons)
-#include "../support/Patience.h"
 #include "tst_touchbuttons.moc"

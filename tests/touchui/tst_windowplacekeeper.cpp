@@ -1,4 +1,5 @@
 // A window whose place the window system tells wrong.
+#include "../support/Patience.h"
 #include "touchui/WindowPlaceKeeper.h"
 
 #include <QDialog>
@@ -78,5 +79,4 @@ void tst_WindowPlaceKeeper::doesNotQuarrel()
 }
 
 QTEST_MAIN(tst_WindowPlaceKeeper)
-#include "../support/Patience.h"
 #include "tst_windowplacekeeper.moc"
