@@ -94,13 +94,14 @@ class Process:
         return self.popen.poll() is None
 
     def works(self):
-        """Whether a thread of the process runs, or would if a processor were free for it, at this moment. A process that
-        has events left to handle is never found asleep, however long it waits for its turn on a busy machine."""
+        """Whether a thread of the process runs or waits for the disk, or would run if a processor were free for it, at this
+        moment. A process that has events left to handle is never found asleep, however long it waits for its turn on a busy
+        machine: a line of its log can wait for a disk that all others use, too."""
         folder = f"/proc/{self.pid}/task"
         try:
             for thread in os.listdir(folder):
                 with open(f"{folder}/{thread}/stat", encoding="utf-8", errors="replace") as stream:
-                    if stream.read().rpartition(")")[2].split()[0] == "R":
+                    if stream.read().rpartition(")")[2].split()[0] in "RD":
                         return True
         except OSError:
             pass  # it has ended, or a thread has
