@@ -94,13 +94,14 @@ class Process:
         return self.popen.poll() is None
 
     def works(self):
-        """Whether a thread of the process runs, or would if a processor were free for it, at this moment. A process that
-        has events left to handle is never found asleep, however long it waits for its turn on a busy machine."""
+        """Whether a thread of the process runs or waits for the disk, or would run if a processor were free for it, at this
+        moment. A process that has events left to handle is never found asleep, however long it waits for its turn on a busy
+        machine: a line of its log can wait for a disk that all others use, too."""
         folder = f"/proc/{self.pid}/task"
         try:
             for thread in os.listdir(folder):
                 with open(f"{folder}/{thread}/stat", encoding="utf-8", errors="replace") as stream:
-                    if stream.read().rpartition(")")[2].split()[0] == "R":
+                    if stream.read().rpartition(")")[2].split()[0] in "RD":
                         return True
         except OSError:
             pass  # it has ended, or a thread has
@@ -112,16 +113,16 @@ class Process:
             self.popen.send_signal(number)
 
     def wait(self, timeout):
-        """The exit code; raises SessionError when the process is still there after timeout seconds."""
+        """The exit code; raises SessionError when the process is still there after timeout seconds, later on a busy machine."""
         try:
-            return self.popen.wait(timeout)
+            return self.popen.wait(deadline_after(timeout) - time.monotonic())
         except subprocess.TimeoutExpired:
             raise SessionError(f"{self.name} has not ended after {timeout} s") from None
 
     def stop(self, timeout=10):
         self.signal(signal.SIGTERM)
         try:
-            self.popen.wait(timeout)
+            self.popen.wait(deadline_after(timeout) - time.monotonic())
         except subprocess.TimeoutExpired:
             self.signal(signal.SIGKILL)
             self.popen.wait()
@@ -227,20 +228,34 @@ class Display:
     def click(self, x, y, button=1):
         self.xdotool("mousemove", x, y, "click", button)
 
-    def grab(self):
-        """The screen as (width, height, RGB bytes)."""
+    def frame(self):
+        """The screen as it is kept: a line after another, a pixel as the bytes blue, green, red and one that means nothing."""
         with open(os.path.join(self.folder, "Xvfb_screen0"), "rb") as stream:
             data = stream.read()
         header = struct.unpack(">25I", data[:100])
         header_size, width, height = header[0], header[4], header[5]
         bits_per_pixel, line, colours = header[11], header[12], header[19]
-        if bits_per_pixel != 32 or line != width * 4:
+        if (width, height, bits_per_pixel, line) != (WIDTH, HEIGHT, 32, width * 4):
             raise SessionError(f"unexpected frame buffer of {bits_per_pixel} bits, {line} bytes a line")
         start = header_size + colours * 12
-        pixels = data[start:start + line * height]
-        rgb = bytearray(width * height * 3)
+        return data[start:start + line * height]
+
+    def part(self, left, top, width, height):
+        """The pixels of a part of the screen, as in frame()."""
+        pixels = self.frame()
+        lines = ((WIDTH * row + left) * 4 for row in range(top, top + height))
+        return b"".join(pixels[line:line + width * 4] for line in lines)
+
+    def pixel(self, x, y):
+        """The red, green and blue of a point of the screen."""
+        return tuple(reversed(self.part(x, y, 1, 1)[:3]))
+
+    def grab(self):
+        """The screen as (width, height, RGB bytes); takes much longer than frame()."""
+        pixels = self.frame()
+        rgb = bytearray(WIDTH * HEIGHT * 3)
         rgb[0::3], rgb[1::3], rgb[2::3] = pixels[2::4], pixels[1::4], pixels[0::4]
-        return width, height, bytes(rgb)
+        return WIDTH, HEIGHT, bytes(rgb)
 
     def screenshot(self, path):
         write_png(path, *self.grab())
@@ -253,13 +268,13 @@ class Display:
         """Waits until the screen has not changed for quiet seconds and no process behind it has worked at any look. On a
         busy machine a program may take longer than that to get a processor at all."""
         deadline = deadline_after(timeout)
-        last, since, looks = self.grab()[2], time.monotonic(), 0
+        last, since, looks = self.frame(), time.monotonic(), 0
         while looks < LOOKS_WHEN_STILL or time.monotonic() - since < quiet:
             if time.monotonic() > deadline:
                 raise SessionError(f"the screen still changes after {timeout} s")
             time.sleep(0.03)
             works = any(process.works() for process in self.watched)
-            now = self.grab()[2]
+            now = self.frame()
             looks += 1
             if works or now != last:
                 last, since, looks = now, time.monotonic(), 0

@@ -1,5 +1,6 @@
 // Requests that come before the hand-shakes are through.
 #include "app/EarlyRequests.h"
+#include "tests/support/Patience.h"
 
 #include <QEventLoop>
 #include <QTest>

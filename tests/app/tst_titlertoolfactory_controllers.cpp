@@ -12,6 +12,7 @@
 #include "messaging/ptc/IAdapterBase.h"
 #include "messaging/ptc/IProxyBase.h"
 #include "messaging/services/ServiceFamilies.h"
+#include "tests/support/Patience.h"
 
 #include <QSignalSpy>
 #include <QTest>

@@ -1,6 +1,7 @@
 // The row of buttons above the canvas: taps, looks, enabling and the Canvas menu.
 #include "app/APPEventFilter.h"
 #include "app/ToolsBar.h"
+#include "tests/support/Patience.h"
 #include "tests/touchui/TouchDevice.h"
 #include "touchui/KSPushbutton.h"
 
@@ -97,7 +98,7 @@ void tst_toolsbar::init()
                          m_window.get());
     m_bar->setGeometry(0, 8, 1363, 67);
     m_window->show();
-    QVERIFY(QTest::qWaitForWindowExposed(m_window.get()));
+    QVERIFY(QTest::qWaitForWindowExposed(m_window.get(), PATIENCE_MS));
 }
 
 void tst_toolsbar::cleanup()
@@ -120,7 +121,7 @@ QLabel* tst_toolsbar::label(const char* name) const
 void tst_toolsbar::openMenu()
 {
     QTest::mouseClick(button("Canvas"), Qt::LeftButton);
-    QVERIFY(QTest::qWaitForWindowExposed(menu()));
+    QVERIFY(QTest::qWaitForWindowExposed(menu(), PATIENCE_MS));
 }
 
 void tst_toolsbar::layout()
@@ -393,7 +394,7 @@ void tst_toolsbar::fingerThatOpenedTheMenuIsLifted()
     QTest::touchEvent(canvas, m_device).press(0, QPoint(60, 20));
     QVERIFY(!menu()->isVisible());
     QTest::touchEvent(canvas, m_device).move(0, QPoint(60, -200));
-    QVERIFY(QTest::qWaitForWindowExposed(menu()));
+    QVERIFY(QTest::qWaitForWindowExposed(menu(), PATIENCE_MS));
     QVERIFY(APPEventFilter::instance()->isLock(nullptr, LOCKMETHOD_TOUCH));
     QTest::touchEvent(canvas, m_device).release(0, QPoint(60, -200));
     QVERIFY(!APPEventFilter::instance()->isLock(nullptr, LOCKMETHOD_TOUCH));

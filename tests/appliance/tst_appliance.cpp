@@ -16,6 +16,7 @@
 #include "messaging/services/TitlerAdapter.h"
 #include "tests/fakes/FakeTitler.h"
 #include "tests/messaging/TestPorts.h"
+#include "tests/support/Patience.h"
 
 #include <QJsonArray>
 #include <QJsonDocument>
@@ -223,7 +224,7 @@ QJsonObject tst_appliance::event(const QString& kind)
 
 void tst_appliance::expect(const QStringList& calls)
 {
-    QTRY_VERIFY_WITH_TIMEOUT(m_titler->calls.size() >= calls.size(), 20000);
+    QTRY_VERIFY(m_titler->calls.size() >= calls.size());
     QCOMPARE(m_titler->calls, calls);
     m_titler->calls.clear();
 }
@@ -492,7 +493,7 @@ void tst_appliance::titlerStartedAnew()
     command("create 1");
     expect({"create 1"});
     m_titler = std::make_unique<SmallTitler>();
-    QTRY_VERIFY_WITH_TIMEOUT(m_titler->initialize(), 20000);
+    QTRY_VERIFY(m_titler->initialize());
     auto* center = m_titler->service<IMessageCenter>(65);
     center->registerCallBack(m_titler.get());
     expect({"client id 1"});

@@ -4,6 +4,7 @@
 #include "appliance/SampleText.h"
 #include "document/TText.h"
 #include "library/ThumbnailRender.h"
+#include "tests/support/Patience.h"
 
 #include <QFontDatabase>
 #include <QImage>
@@ -20,7 +21,6 @@ const QSize RASTER(1920, 1080);
 const QSize CANVAS(1280, 720);
 const QRect TITLE_SAFE(192, 108, 1536, 864);
 constexpr double CONTRAST = 4.5;
-constexpr int PICTURES_TIMEOUT_MS = 60000;
 // The steps of the size box.
 const QSet<int> LADDER{20, 24,  28,  32,  36,  40,  44,  48,  54,  60,  64,  66,  72,  80, 88,
                        96, 115, 138, 166, 199, 239, 287, 344, 413, 496, 595, 714, 857, 999};
@@ -136,7 +136,7 @@ QImage tst_presettemplates::pictureOf(const SampleTitles::Sample& sample, std::s
     title.setText({std::make_unique<TText>(*sample.archive.text().at(text)).release()});
     ThumbnailRender render;
     render.makeThumbnail(&title, true);
-    if (!QTest::qWaitFor([&render] { return render.makePictureThreadIsFinished(); }, PICTURES_TIMEOUT_MS)) {
+    if (!QTest::qWaitFor([&render] { return render.makePictureThreadIsFinished(); }, PATIENCE_MS)) {
         return {};
     }
     const QString folder = mDir.path() + QLatin1Char('/');

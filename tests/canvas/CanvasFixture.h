@@ -2,6 +2,7 @@
 #pragma once
 
 #include "CanvasTestTools.h"
+#include "tests/support/Patience.h"
 
 #include "canvas/CanvasScene.h"
 #include "canvas/CaretGeometry.h"
@@ -48,7 +49,7 @@ public:
     void show()
     {
         view.show();
-        QVERIFY(QTest::qWaitForWindowActive(&view));
+        QVERIFY(QTest::qWaitForWindowActive(&view, PATIENCE_MS));
     }
     void open(const QList<TText>& texts)
     {

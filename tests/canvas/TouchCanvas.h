@@ -1,6 +1,7 @@
 #pragma once
 
 #include "CanvasFixture.h"
+#include "tests/support/Patience.h"
 
 #include "tests/touchui/TouchDevice.h"
 #include "touchui/KSAppEventFilter.h"
@@ -35,7 +36,7 @@ public:
     void show()
     {
         window.show();
-        QVERIFY(QTest::qWaitForWindowActive(&window));
+        QVERIFY(QTest::qWaitForWindowActive(&window, PATIENCE_MS));
         view.setFocus();
     }
 

@@ -3,11 +3,10 @@
 #include "tests/support/FullDisk.h"
 
 #include "support/RefusedWrites.h"
+#include "tests/support/Patience.h"
 
 namespace
 {
-
-constexpr int RETRY_TIMEOUT = 15000; // ms; refused writes are tried again every 5 s
 
 using Posted = QList<QPair<int, QString>>;
 
@@ -75,7 +74,7 @@ void tst_canvasscene_fulldisk::refusedEditIsToldOnceAndSavedWhenThereIsRoom()
         QCOMPARE(onDisk(path), before);
     }
     // Nobody does anything.
-    QTRY_VERIFY_WITH_TIMEOUT(onDisk(path) != before, RETRY_TIMEOUT);
+    QTRY_VERIFY(onDisk(path) != before);
     QVERIFY(hasText(path, "abc"));
     QCOMPARE(messages->posted, (Posted{{114, "File"}}));
     QVERIFY(RefusedWrites::isEmpty());
@@ -141,7 +140,7 @@ void tst_canvasscene_fulldisk::refusedEditFollowsItsFolder()
         QVERIFY(QDir().rename(before, after));
         canvas.scene->folderRenamed(before, after);
     }
-    QTRY_VERIFY_WITH_TIMEOUT(RefusedWrites::isEmpty(), RETRY_TIMEOUT);
+    QTRY_VERIFY(RefusedWrites::isEmpty());
     QVERIFY(hasText(after + "/title.xml", "ab"));
     QVERIFY(!QFileInfo::exists(before));
 }

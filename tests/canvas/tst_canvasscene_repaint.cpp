@@ -1,5 +1,6 @@
 // The canvas is repainted for a cause, and never while nothing happens.
 #include "CanvasFixture.h"
+#include "tests/support/Patience.h"
 
 #include <QAbstractEventDispatcher>
 #include <QTimerEvent>

@@ -1,4 +1,5 @@
 #include "TextPair.h"
+#include "tests/support/Patience.h"
 
 #include "canvas/CaretGeometry.h"
 #include "canvas/CharacterFormat.h"
@@ -289,7 +290,7 @@ void tst_graphicstext::pastedTextIsPlain()
     Pair pair(makeRecord("a"));
     QGraphicsView view(&pair.scene);
     view.show();
-    QVERIFY(QTest::qWaitForWindowActive(&view));
+    QVERIFY(QTest::qWaitForWindowActive(&view, PATIENCE_MS));
     pair.child->initNewTextSelectAll();
     auto* rich = new QMimeData;
     rich->setHtml("<table><tr><td><b>x</b></td></tr></table><ul><li>y</li></ul>");

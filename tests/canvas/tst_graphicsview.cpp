@@ -1,4 +1,5 @@
 #include "canvas/GraphicsView.h"
+#include "tests/support/Patience.h"
 #include "tests/touchui/TouchDevice.h"
 
 #include <QApplication>
@@ -70,7 +71,7 @@ void tst_graphicsview::init()
     m_view->setFrameStyle(0);
     m_view->resize(400, 300);
     m_view->show();
-    QVERIFY(QTest::qWaitForWindowExposed(m_view));
+    QVERIFY(QTest::qWaitForWindowExposed(m_view, PATIENCE_MS));
 }
 
 void tst_graphicsview::cleanup()

@@ -1,4 +1,5 @@
 #include "TouchCanvas.h"
+#include "tests/support/Patience.h"
 
 #include "messaging/services/SubCommonDefine.h"
 #include "tests/fakes/FakeSoftKeyBoardController.h"
@@ -175,7 +176,7 @@ void tst_scenekeyboard::eachTouchAsksOnce()
     m_keyboard->shown.clear();
     canvas.press(place);
     if (touch == LongPress)
-        QTRY_VERIFY_WITH_TIMEOUT(item->isHandleCaret(), 10000);
+        QTRY_VERIFY(item->isHandleCaret());
     canvas.release(place);
     QCOMPARE(m_keyboard->shown.size(), 1);
     const auto data = m_keyboard->shown.constLast();
@@ -727,7 +728,7 @@ void tst_scenekeyboard::serviceDiesWithoutATrace()
     sendText("Brea");
     m_context->setKeyBoardController(nullptr);
     QCOMPARE(canvas.stack.count(), 0);
-    QTRY_COMPARE_WITH_TIMEOUT(canvas.stack.count(), 1, 10000);
+    QTRY_COMPARE(canvas.stack.count(), 1);
     QCOMPARE(canvas.saved()->getText()[0]->getText(), std::string("MBrea"));
     QCOMPARE(canvas.text(1)->getFocusFlag(), int(TextObjectConstants::FocusEdit));
 }

@@ -1,4 +1,5 @@
 #include "TextPair.h"
+#include "tests/support/Patience.h"
 
 #include "canvas/CaretGeometry.h"
 #include "canvas/CharacterFormat.h"
@@ -229,7 +230,7 @@ void tst_textpainter::paintedInAViewInsideAWindow()
     view.setRenderHint(QPainter::Antialiasing);
     view.setGeometry(600, 100, 1280, 720);
     window.show();
-    QVERIFY(QTest::qWaitForWindowExposed(&window));
+    QVERIFY(QTest::qWaitForWindowExposed(&window, PATIENCE_MS));
     QVERIFY(count(window.grab().toImage(), QColor(255, 255, 255)) >= whole * 9 / 10);
 }
 

@@ -6,6 +6,7 @@
 #include "document/TText.h"
 #include "support/FileSyncQueue.h"
 #include "support/LeftoverSweep.h"
+#include "tests/support/Patience.h"
 #include "tests/support/RandomSeed.h"
 
 #include <QCoreApplication>

@@ -16,6 +16,7 @@ import tempfile
 import time
 import unittest
 import xml.etree.ElementTree
+import zlib
 
 HERE = os.path.dirname(os.path.abspath(__file__))
 sys.path.insert(0, os.path.join(os.path.dirname(os.path.dirname(HERE)), "scripts"))
@@ -294,8 +295,11 @@ class TitlerTest(unittest.TestCase):
 
     def pixel(self, x, y):
         """A pixel of the screen, which the window fills."""
-        width, _, rgb = self.display.grab()
-        return tuple(rgb[3 * (y * width + x):3 * (y * width + x) + 3])
+        return self.display.pixel(x, y)
+
+    def canvas(self):
+        """A number for what the canvas shows."""
+        return zlib.crc32(self.display.part(*CANVAS))
 
     def wait_picker(self, lit=PICKER_LIT):
         """Waits until the folder picker is there and no mask before it; a click before that is not for it."""
@@ -357,15 +361,10 @@ class TitlerTest(unittest.TestCase):
 
     def leave_templates(self, button):
         """Clicks at a button of the open picker and waits until it has gone; a click before that is not for the window."""
-        def heading():
-            width, _, rgb = self.display.grab()
-            left, top, columns, rows = TEMPLATE_HEADING
-            return [rgb[3 * (y * width + left):3 * (y * width + left + columns)] for y in range(top, top + rows)]
-
         self.display.wait_until_still()  # it may just be coming to its place
-        picker = heading()
+        picker = self.display.part(*TEMPLATE_HEADING)
         self.click(*TEMPLATE_BUTTONS[button])
-        session.wait_until(lambda: heading() != picker, 20 * SLOW, "the template picker to go")
+        session.wait_until(lambda: self.display.part(*TEMPLATE_HEADING) != picker, 20 * SLOW, "the template picker to go")
         self.display.wait_until_still()
 
     def create_in_list(self, row, template=0):

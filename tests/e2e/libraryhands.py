@@ -27,12 +27,7 @@ class LibraryTest(harness.TitlerTest):
 
     def part(self, left, top, right, bottom):
         """The pixels of a part of the screen."""
-        width, _, rgb = self.display.grab()
-        return b"".join(rgb[3 * (row * width + left):3 * (row * width + right)] for row in range(top, bottom))
-
-    def canvas(self):
-        left, top, width, height = harness.CANVAS
-        return self.part(left, top, left + width, top + height)
+        return self.display.part(left, top, right - left, bottom - top)
 
     # The list
 
@@ -64,9 +59,9 @@ class LibraryTest(harness.TitlerTest):
 
     def lift(self):
         """In move mode, puts a finger on the handle of the first title until it is lifted."""
-        before = self.display.grab()
+        before = self.display.frame()
         self.display.down(*HANDLE)
-        harness.session.wait_until(lambda: self.display.grab() != before, 20 * harness.SLOW, "the lifted title")
+        harness.session.wait_until(lambda: self.display.frame() != before, 20 * harness.SLOW, "the lifted title")
 
     def carry_to(self, y):
         for place in range(HANDLE[1], y, 15):

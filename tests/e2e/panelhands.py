@@ -50,6 +50,13 @@ class PanelTest(harness.TitlerTest):
     def use(self, name):
         self.tap(PANEL[name])
 
+    def open(self, name, place):
+        """Taps a button and waits until what it opens can be seen at a place."""
+        before = self.pixel(*place)
+        self.use(name)
+        session.wait_until(lambda: self.pixel(*place) != before, 20 * harness.SLOW, f"what {name} opens")
+        self.display.wait_until_still()
+
     def tool(self, name):
         self.tap(harness.TOOL_POINTS[name])
 
@@ -92,7 +99,7 @@ class PanelTest(harness.TitlerTest):
         self.screenshot("selected.png")
 
     def style_word(self):
-        self.use("Color")
+        self.open("Color", PALETTE_BLUE)
         self.tap(PALETTE_BLUE)
         self.tap(PALETTE_RED)
         self.screenshot("palette.png")
@@ -105,7 +112,7 @@ class PanelTest(harness.TitlerTest):
         self.display.wait_until_still()
         self.use("Bold")
         self.use("EdgeOn")
-        self.use("EdgeWidth")
+        self.open("EdgeWidth", SLIDER_AT_TWO)
         self.drag(SLIDER_AT_TWO, SLIDER_AT_FIVE)
         self.screenshot("slider.png")
         self.tap(BESIDE_EVERYTHING)

@@ -5,6 +5,7 @@ import unittest
 
 import harness
 import session
+import wire
 
 TITLE_REFUSED = 114
 CONFIRM_CLOSE = 117
@@ -42,7 +43,8 @@ class FullDisk(harness.TitlerTest):
         os.remove(os.path.join(self.environment["K2SYS_AC_DATA"], "filler"))
 
     def snapshot(self, folder):
-        """The bytes of every file of the folder by name."""
+        """The bytes of every file of the folder by name, once no version is kept that waits for the disk."""
+        session.wait_until(lambda: not wire.kept_versions(folder), 60 * harness.SLOW, "the disk to take the folder")
         files = {}
         for name in sorted(os.listdir(folder)):
             with open(os.path.join(folder, name), "rb") as stream:

@@ -52,7 +52,7 @@ class KilledSession(MortalTitler, LibrarySession):
         for row in range(6):
             x, y = self.list_point(row)
             pixels = self.part(x - 300, y - 40, x - 150, y + 40)
-            if len({pixels[at:at + 3] for at in range(0, len(pixels), 3)}) == 1:
+            if len({pixels[at:at + 3] for at in range(0, len(pixels), 4)}) == 1:
                 break
             count += 1
         return count
@@ -68,7 +68,9 @@ class KilledSession(MortalTitler, LibrarySession):
         self.command(f'edit "{self.folder(name)}"')
         self.wait_call("FileManagerController", "titlerEditStatus", start)
         self.wait_shown()
-        self.assertEqual(self.rows_shown(), len(before))
+        # The pictures of the rows come from the disk, which may be slow.
+        harness.session.wait_until(lambda: self.rows_shown() == len(before), 20 * harness.SLOW,
+                                   f"{len(before)} rows of the list")
         self.screenshot("shown.png")
         self.close_window()
         self.wait_no_leftovers(self.folder(name))

@@ -1,7 +1,6 @@
 """The property panel by finger in the real window: what mixed letters show and keep, what leaves no step to be undone,
 and sizes that are none."""
 import unittest
-import zlib
 
 import harness
 from panelhands import (BESIDE_EVERYTHING, CORNER_OF_CANVAS, ON_THE_TEXT, PALETTE_BLUE, PALETTE_CANCEL, SLIDER_AT_FIVE,
@@ -15,12 +14,6 @@ class Panel(PanelTest):
     def setUp(self):
         super().setUp()
         self.type_new_text()
-
-    def canvas(self):
-        x, y, width, height = harness.CANVAS
-        screen_width, _, rgb = self.display.grab()
-        rows = (rgb[3 * (row * screen_width + x):3 * (row * screen_width + x + width)] for row in range(y, y + height))
-        return zlib.crc32(b"".join(rows))
 
     def leave_text(self):
         self.tap(CORNER_OF_CANVAS)
@@ -47,7 +40,7 @@ class Panel(PanelTest):
         mixed = self.canvas()
 
         # Cancel gives each letter its own colour back, and nothing is left to be undone by it.
-        self.use("Color")
+        self.open("Color", PALETTE_BLUE)
         self.tap(PALETTE_BLUE)
         self.assertNotEqual(self.canvas(), mixed)
         self.tap(PALETTE_CANCEL)
@@ -81,7 +74,7 @@ class Panel(PanelTest):
         plain = self.canvas()
         self.use("EdgeOn")
         edged = self.canvas()
-        self.use("EdgeWidth")
+        self.open("EdgeWidth", SLIDER_AT_TWO)
         self.display.down(*SLIDER_AT_TWO)
         self.display.move(*SLIDER_AT_FIVE)
         self.display.wait_until_still()

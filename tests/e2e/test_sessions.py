@@ -21,9 +21,9 @@ class ClosingQuestion(harness.TitlerTest):
         self.click_tool("Close")
         message = self.wait_call("MessageCenter", "postMessage", start)
         self.assertEqual(message["messageId"], CONFIRM_CLOSE)
-        before = self.display.grab()
+        before = self.display.frame()
         self.command("message-mask 1")  # as the message center does around a box
-        harness.session.wait_until(lambda: self.display.grab() != before, 20 * harness.SLOW, "the mask")
+        harness.session.wait_until(lambda: self.display.frame() != before, 20 * harness.SLOW, "the mask")
         self.assertTrue(self.stays_shown())
         # The answer to another question is not the answer to this one.
         self.command(f"message-close 110 {ANSWER_OK}")
@@ -50,13 +50,13 @@ class Requests(harness.TitlerTest):
     def test_a_request_for_a_window_that_shows_is_dropped(self):
         first, second = self.titles(self.folder())[:2]
         self.open_title(first)
-        before = self.display.grab()
+        before = self.display.frame()
         self.command(f'edit "{second.path}"')
         # A later call on the same connection is handled after the dropped one.
         self.command("dialog-mask 1")
-        harness.session.wait_until(lambda: self.display.grab() != before, 20 * harness.SLOW, "the mask")
+        harness.session.wait_until(lambda: self.display.frame() != before, 20 * harness.SLOW, "the mask")
         self.command("dialog-mask 0")
-        harness.session.wait_until(lambda: self.display.grab() == before, 20 * harness.SLOW, "the first title again")
+        harness.session.wait_until(lambda: self.display.frame() == before, 20 * harness.SLOW, "the first title again")
         self.assert_canvas_shows(first, mean=1.0, visible=0.01)
 
     def test_the_folder_of_the_titles_is_printed_once(self):

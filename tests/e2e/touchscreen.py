@@ -3,13 +3,17 @@ driven through a socket and reaches the programs as any other touch hardware doe
 
 xdotool's pointer and keys work on it as on any server.
 """
+import contextlib
 import ctypes
 import os
 import socket
 import struct
+import threading
 
 import session
 
+# A finger that rests reports its place so often.
+REPORT_SECONDS = 1
 CONFIGURATION = """
 Section "ServerFlags"
   Option "AutoAddDevices" "false"
@@ -191,17 +195,15 @@ class TouchDisplay(session.Display):
             self.device.socket.close()
             self.device = None
 
-    def grab(self):
-        pixels = self.reader.read()
-        rgb = bytearray(session.WIDTH * session.HEIGHT * 3)
-        rgb[0::3], rgb[1::3], rgb[2::3] = pixels[2::4], pixels[1::4], pixels[0::4]
-        return session.WIDTH, session.HEIGHT, bytes(rgb)
+    def frame(self):
+        return self.reader.read()
 
     def down(self, x, y, finger=0):
         self.touching[finger] = (x, y)
         self.device.send((TOUCH_BEGIN, finger, x, y))
 
     def move(self, x, y, finger=0):
+        self.touching[finger] = (x, y)
         self.device.send((TOUCH_UPDATE, finger, x, y))
 
     def up(self, x, y, finger=0):
@@ -212,6 +214,30 @@ class TouchDisplay(session.Display):
         """Lifts the fingers that a test, cut off in a gesture, has left on the screen."""
         for finger, place in list(self.touching.items()):
             self.up(*place, finger)
+
+    def wait_until_still(self, timeout=60, quiet=0.3):
+        """As for every display. Fingers that lie on the screen meanwhile report their places again and again, as those of a hand
+        do: a program takes one that is silent for long for left behind, and on a busy machine it can take long until all is still."""
+        with self._fingers_reporting():
+            super().wait_until_still(timeout, quiet)
+
+    @contextlib.contextmanager
+    def _fingers_reporting(self):
+        enough = threading.Event()
+
+        def report():
+            while not enough.wait(REPORT_SECONDS):
+                self.device.send(*((TOUCH_UPDATE, finger, *place) for finger, place in self.touching.items()))
+
+        reporter = threading.Thread(target=report)
+        if self.touching:
+            reporter.start()
+        try:
+            yield
+        finally:
+            enough.set()
+            if reporter.is_alive():
+                reporter.join()
 
     def tap(self, x, y, finger=0):
         """Puts a finger down and lifts it, too quickly to be taken for one that stays."""

@@ -17,6 +17,7 @@ FRAME_SIZE = peer.FRAME_SIZE
 HEADER_SIZE = peer.HEADER.size
 MAX_PAYLOAD = FRAME_SIZE - HEADER_SIZE
 TITLER_OBJECT = 117
+KEPT_PREFIX = ".titler-kept-"
 SHOW_CREATE, SHOW_EDIT, DIALOG_MASK, MESSAGE_MASK, REGISTER = 1, 2, 3, 4, 5
 
 pack_int = peer.pack_int
@@ -104,8 +105,14 @@ def resident(pid):
     raise harness.session.SessionError(f"process {pid} has no memory")
 
 
+def kept_versions(folder):
+    return [name for _, _, files in os.walk(folder) for name in files if name.startswith(KEPT_PREFIX)]
+
+
 def snapshot(folder):
-    """What lies under a folder: a digest for each file, None for each folder."""
+    """What lies under a folder: a digest for each file, None for each folder. Waits until the versions that a titler keeps
+    until the disk has synced are gone."""
+    harness.session.wait_until(lambda: not kept_versions(folder), 60 * harness.SLOW, f"the disk to take {folder}")
     found = {}
     for place, folders, files in os.walk(folder):
         for name in folders:

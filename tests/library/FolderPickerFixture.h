@@ -1,6 +1,7 @@
 #pragma once
 
 #include "LibraryFixture.h"
+#include "tests/support/Patience.h"
 #include "tests/touchui/InputContextFixture.h"
 #include "tests/touchui/TouchFixture.h"
 
@@ -52,9 +53,9 @@ public:
         tree()->setHoldInterval(HOLD);
         picker->updateTreeView();
         picker->show();
-        QVERIFY(QTest::qWaitForWindowExposed(picker.get()));
+        QVERIFY(QTest::qWaitForWindowExposed(picker.get(), PATIENCE_MS));
         picker->activateWindow();
-        QVERIFY(QTest::qWaitForWindowActive(picker.get()));
+        QVERIFY(QTest::qWaitForWindowActive(picker.get(), PATIENCE_MS));
     }
 
     void close()

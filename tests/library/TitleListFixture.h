@@ -1,6 +1,7 @@
 #pragma once
 
 #include "LibraryFixture.h"
+#include "tests/support/Patience.h"
 
 #include "library/ArchiveItem.h"
 #include "library/ArchiveList.h"
@@ -48,7 +49,7 @@ public:
             canvas.append(archive ? QString::fromStdString(archive->getName()) : QStringLiteral("null"));
         });
         window.show();
-        if (!QTest::qWaitForWindowExposed(&window))
+        if (!QTest::qWaitForWindowExposed(&window, PATIENCE_MS))
             qFatal("no window");
     }
     ~TitleListFixture() override
@@ -63,10 +64,12 @@ public:
     void open(const QString& folder)
     {
         list->refreshArchiveList(folder);
-        const bool complete = QTest::qWaitFor([this] {
-            const ArchiveItem* last = item(list->count() - 1);
-            return !last || last->hasChildWidgets();
-        });
+        const bool complete = QTest::qWaitFor(
+            [this] {
+                const ArchiveItem* last = item(list->count() - 1);
+                return !last || last->hasChildWidgets();
+            },
+            PATIENCE_MS);
         if (!complete)
             qFatal("the titles have no pictures");
         canvas.clear();

@@ -1,5 +1,6 @@
 // The threads that load a folder, write title files and open a picker.
 #include "LibraryFixture.h"
+#include "tests/support/Patience.h"
 
 #include "library/ArchiveInitThread.h"
 #include "library/ArchiveList.h"

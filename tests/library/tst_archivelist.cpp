@@ -1,5 +1,6 @@
 // The title list on folders: opening, selecting, the option menu, limits, saves that come back.
 #include "LibraryFixture.h"
+#include "tests/support/Patience.h"
 
 #include "library/ArchiveItem.h"
 #include "library/ArchiveList.h"
@@ -124,7 +125,7 @@ void tst_archivelist::init()
         mCanvas.append(archive ? QString::fromStdString(archive->getName()) : QStringLiteral("null"));
     });
     mList->show();
-    QVERIFY(QTest::qWaitForWindowExposed(mList.get()));
+    QVERIFY(QTest::qWaitForWindowExposed(mList.get(), PATIENCE_MS));
     mContext.createNew = false;
     mFolders.take();
     mMessages.take();

@@ -7,6 +7,7 @@
 #include "library/ArchiveItem.h"
 #include "library/ArchiveList.h"
 #include "library/ThumbnailRender.h"
+#include "tests/support/Patience.h"
 
 #include <QLabel>
 #include <QPainter>
@@ -125,7 +126,7 @@ void tst_archivelist_canvas::leavingANewTitleWritesItsPictures()
     QVERIFY(stem != QStringLiteral("a"));
     mList->selectArchive(mList->count() - 1 - mList->getItemIndex(mList->getSelectedArchive()));
     QCOMPARE(canvasTitle(), QStringLiteral("a"));
-    QTRY_VERIFY_WITH_TIMEOUT(mScene->isEditFinish(), 20000);
+    QTRY_VERIFY(mScene->isEditFinish());
     for (const char* suffix : {"_1920.png", "_960.png", "_240.png", "_240S.png"})
         QVERIFY(!QImage(folder + QLatin1Char('/') + stem + QLatin1String(suffix)).isNull());
 }
@@ -142,7 +143,7 @@ void tst_archivelist_canvas::leavingATextThatIsTypedWritesItsPictures()
     QTest::mouseClick(mList->archiveItem(1), Qt::LeftButton, Qt::NoModifier, QPoint(20, 20));
     QCOMPARE(canvasTitle(), QStringLiteral("b"));
     QVERIFY(!mScene->isEditFinish());
-    QTRY_VERIFY_WITH_TIMEOUT(mScene->isEditFinish(), 20000);
+    QTRY_VERIFY(mScene->isEditFinish());
     const QRect ink = inkIn(QImage(folder + QStringLiteral("/a_1920.png")));
     QVERIFY(ink.width() > 200);
     // The other was only looked at.
@@ -213,14 +214,13 @@ void tst_archivelist_canvas::deletedTitleLeavesNoPictures()
     createTitle(QStringLiteral("Kept"));
     const QString kept = canvasTitle();
     createTitle(QStringLiteral("Gone"));
-    QTRY_COMPARE_WITH_TIMEOUT(reporter.reached.available(), 1,
-                              20000); // the thread is busy with the first one
+    QTRY_COMPARE(reporter.reached.available(), 1); // the thread is busy with the first one
     const QString gone = canvasTitle();
     QVERIFY(gone != kept);
     mStack->undo();
     mList->synchronizationFolderFile();
     reporter.goOn.release(1000);
-    QTRY_VERIFY_WITH_TIMEOUT(mScene->isEditFinish(), 20000);
+    QTRY_VERIFY(mScene->isEditFinish());
     QCOMPARE(QDir(folder).entryList({gone + QLatin1Char('*')}, QDir::Files), QStringList());
     for (const char* suffix : {".xml", "_1920.png", "_960.png", "_240.png", "_240S.png"})
         QVERIFY(QFile::exists(folder + QLatin1Char('/') + kept + QLatin1String(suffix)));
@@ -238,16 +238,16 @@ void tst_archivelist_canvas::picturesFollowTheirFolder()
         createTitle(QStringLiteral("One"));
         mScene->slotMakeSceneThumnail();
         // The thread is busy with it.
-        QTRY_COMPARE_WITH_TIMEOUT(reporter.reached.available(), 1, 20000);
+        QTRY_COMPARE(reporter.reached.available(), 1);
         createTitle(QStringLiteral("Two"));
         createTitle(QStringLiteral("Three"));
         mScene->slotMakeSceneThumnail();
         QVERIFY(QDir().rename(before, after));
         reporter.goOn.release(1000);
-        QTRY_VERIFY_WITH_TIMEOUT(mScene->isEditFinish(), 20000); // those that went into the void
+        QTRY_VERIFY(mScene->isEditFinish()); // those that went into the void
         createTitle(QStringLiteral("lost with the folder"));
         mList->refreshArchiveListForChangeFolderName(before, after);
-        QTRY_VERIFY_WITH_TIMEOUT(mScene->isEditFinish(), 20000);
+        QTRY_VERIFY(mScene->isEditFinish());
     }
     QVERIFY(!QFileInfo::exists(before));
     const QStringList titles = QDir(after).entryList({QStringLiteral("*.xml")}, QDir::Files);
@@ -255,7 +255,7 @@ void tst_archivelist_canvas::picturesFollowTheirFolder()
     for (const QString& title : titles) {
         for (const char* suffix : {"_1920.png", "_960.png", "_240.png", "_240S.png"}) {
             const QString picture = after + QLatin1Char('/') + title.chopped(4) + QLatin1String(suffix);
-            QTRY_VERIFY2_WITH_TIMEOUT(!QImage(picture).isNull(), qPrintable(picture), 20000);
+            QTRY_VERIFY2(!QImage(picture).isNull(), qPrintable(picture));
         }
     }
 }
@@ -286,7 +286,7 @@ void tst_archivelist_canvas::picturesShowWhatTheCanvasShows()
 
     mScene->saveArchiveFlag();
     mScene->slotMakeSceneThumnail();
-    QTRY_VERIFY_WITH_TIMEOUT(mScene->isEditFinish(), 20000);
+    QTRY_VERIFY(mScene->isEditFinish());
     const QRect onCanvas = inkIn(canvas);
     const QRect onAir = inkIn(QImage(folder + QStringLiteral("/t_1920.png")));
     QVERIFY(!onCanvas.isEmpty());

@@ -1,5 +1,6 @@
 // Create, paste, delete, move and focus through an undo stack: list, order file, request and reports.
 #include "LibraryFixture.h"
+#include "tests/support/Patience.h"
 #include "tests/support/SettledFolder.h"
 
 #include "library/ArchiveItem.h"
@@ -96,7 +97,7 @@ void tst_archivelist_commands::init()
         mCanvas.append(archive ? QString::fromStdString(archive->getName()) : QStringLiteral("null"));
     });
     mList->show();
-    QVERIFY(QTest::qWaitForWindowExposed(mList.get()));
+    QVERIFY(QTest::qWaitForWindowExposed(mList.get(), PATIENCE_MS));
     mContext.createNew = false;
     mContext.files.clear();
     mCanvas.clear();

@@ -2,6 +2,7 @@
 // order is missing or damaged.
 #include "TitleListFixture.h"
 #include "tests/support/FullDisk.h"
+#include "tests/support/Patience.h"
 #include "tests/support/SettledFolder.h"
 
 #include "document/FolderOrder.h"
@@ -12,8 +13,6 @@ using Names = QStringList;
 
 namespace
 {
-
-constexpr int RETRY_TIMEOUT = 15000; // ms; refused writes are tried again every 5 s
 
 void write(const QString& path, const QByteArray& bytes)
 {
@@ -62,7 +61,7 @@ private:
             posted += mMessages.take();
             return !posted.isEmpty();
         };
-        if (!QTest::qWaitFor(isPosted))
+        if (!QTest::qWaitFor(isPosted, PATIENCE_MS))
             qWarning("no message");
         return posted;
     }
@@ -134,7 +133,7 @@ void tst_archivelist_fulldisk::orderIsToldOnceAndWrittenWhenThereIsRoom()
         QCOMPARE(read(folder + "/.order.xml"), before);
     }
     // Nobody does anything.
-    QTRY_VERIFY_WITH_TIMEOUT(!read(folder + "/.order.xml").contains("\"c.xml\""), RETRY_TIMEOUT);
+    QTRY_VERIFY(!read(folder + "/.order.xml").contains("\"c.xml\""));
     QCOMPARE(LibraryFixture::order(folder), (Names{"a", "b"}));
     QCOMPARE(mMessages.take(), Reports());
     // It could not be written for a while: what it does not name stays for now.
@@ -221,7 +220,7 @@ void tst_archivelist_fulldisk::orderOfAFullDiskIsShownFromMemory()
         QCOMPARE(m->stems(), (Names{"b", "a", "c"}));
         QVERIFY(!QFile::exists(folder + "/.order.xml"));
     }
-    QTRY_VERIFY_WITH_TIMEOUT(QFile::exists(folder + "/.order.xml"), RETRY_TIMEOUT);
+    QTRY_VERIFY(QFile::exists(folder + "/.order.xml"));
     QCOMPARE(LibraryFixture::order(folder), (Names{"b", "a", "c"}));
 }
 

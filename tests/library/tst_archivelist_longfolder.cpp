@@ -1,6 +1,7 @@
 // Folders of more titles than an operator can make: items come as they are looked at and go again, titles are
 // read by and by, and every operation does what it does in a short folder.
 #include "TitleListFixture.h"
+#include "tests/support/Patience.h"
 
 #include "tests/touchui/TouchDevice.h"
 

@@ -1,5 +1,6 @@
 // The folder picker under a finger: choosing, opening, making, copying and renaming folders.
 #include "FolderPickerFixture.h"
+#include "tests/support/Patience.h"
 
 #include <QLabel>
 

@@ -1,6 +1,7 @@
 // What the file manager and other processes do to folders while the folder picker shows, while a name is
 // being typed in it, and while it is hidden.
 #include "FolderPickerFixture.h"
+#include "tests/support/Patience.h"
 
 #include "tests/support/RandomSeed.h"
 

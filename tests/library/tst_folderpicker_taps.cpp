@@ -4,6 +4,7 @@
 #include "FolderPickerFixture.h"
 #include "tests/fakes/ManualClock.h"
 #include "tests/support/LogFixture.h"
+#include "tests/support/Patience.h"
 #include "touchui/KSEventMutexLockObject.h"
 
 #include <QHeaderView>

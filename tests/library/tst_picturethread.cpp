@@ -1,5 +1,6 @@
 // The thread that writes a title's pictures: what it writes, when it counts as finished, what it drops.
 #include "LibraryFixture.h"
+#include "tests/support/Patience.h"
 #include "tests/support/SettledFolder.h"
 
 #include "library/PictureThread.h"
@@ -151,7 +152,7 @@ void tst_picturethread::jobsAreWrittenInOrder()
         thread.addArchive(archive.get(), pictures(Qt::red));
         expected.append({1, stem});
     }
-    QTRY_VERIFY_WITH_TIMEOUT(thread.isThreadWaiting(), 30000);
+    QTRY_VERIFY(thread.isThreadWaiting());
     QCOMPARE(reports.take(), expected);
 }
 
@@ -202,7 +203,7 @@ void tst_picturethread::namesOfTitlesAreNoPictures()
     if (isDeletedMeanwhile)
         QVERIFY(QFile::remove(folder + QStringLiteral("/t.xml")));
     reporter.goOn.release();
-    QTRY_VERIFY_WITH_TIMEOUT(thread.isThreadWaiting(), 20000);
+    QTRY_VERIFY(thread.isThreadWaiting());
     QVERIFY(!QFile::exists(folder + QStringLiteral("/other.XML")));
     QCOMPARE(LibraryFixture::order(folder), (QStringList{QStringLiteral("t"), QStringLiteral("other")}));
     Archive other;
@@ -235,7 +236,7 @@ void tst_picturethread::deletedTitleKeepsNoPictures()
     if (!isBeingWritten)
         QVERIFY(QFile::remove(folder + QStringLiteral("/gone_240.png")));
     reporter.goOn.release(2);
-    QTRY_VERIFY_WITH_TIMEOUT(thread.isThreadWaiting(), 20000);
+    QTRY_VERIFY(thread.isThreadWaiting());
     QCOMPARE(QDir(folder).entryList(QDir::Files, QDir::Name),
              (QStringList{QStringLiteral("kept.xml"), QStringLiteral("kept_1920.png"),
                           QStringLiteral("kept_240.png"), QStringLiteral("kept_240S.png"),

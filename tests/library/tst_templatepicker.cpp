@@ -1,5 +1,6 @@
 // The template picker under a finger, on folders.
 #include "TemplateFixture.h"
+#include "tests/support/Patience.h"
 #include "tests/touchui/TouchDevice.h"
 #include "tests/touchui/TouchFixture.h"
 
@@ -682,7 +683,7 @@ private:
     void show()
     {
         mPicker->show();
-        QVERIFY(QTest::qWaitForWindowExposed(mPicker.get()));
+        QVERIFY(QTest::qWaitForWindowExposed(mPicker.get(), PATIENCE_MS));
     }
 
     void open()

@@ -6,6 +6,7 @@
 #include "library/TemplateItem.h"
 #include "library/TemplatePicker.h"
 #include "library/TemplateTab.h"
+#include "tests/support/Patience.h"
 #include "touchui/KSPushbutton.h"
 
 #include <QTest>
@@ -313,7 +314,7 @@ void tst_templatepicker_notices::taps()
     mFixture.makePresets("templates_en", {"a", "b"});
     mPicker = std::make_unique<TemplatePicker>();
     mPicker->show();
-    QVERIFY(QTest::qWaitForWindowExposed(mPicker.get()));
+    QVERIFY(QTest::qWaitForWindowExposed(mPicker.get(), PATIENCE_MS));
     mLog.takeOperations();
     mPicker->presetTab()->item(1)->clickTriggered();
     mPicker->showUserTemplateTab();

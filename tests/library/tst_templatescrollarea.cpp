@@ -1,5 +1,6 @@
 // One finger on a grid of buttons: taps, drags, flicks, and what further fingers may not do.
 #include "library/TemplateScrollArea.h"
+#include "tests/support/Patience.h"
 #include "tests/touchui/TouchDevice.h"
 
 #include <QGridLayout>
@@ -45,7 +46,7 @@ private Q_SLOTS:
         mArea->setFixedSize(460, 400);
         mArea->initTouch();
         mArea->show();
-        QVERIFY(QTest::qWaitForWindowExposed(mArea.get()));
+        QVERIFY(QTest::qWaitForWindowExposed(mArea.get(), PATIENCE_MS));
         QCOMPARE(mArea->verticalScrollBar()->maximum(), ROWS * BUTTON.height() - 400);
         mPressed = std::make_unique<QSignalSpy>(mArea.get(), &TemplateScrollArea::itemPressed);
     }

@@ -5,6 +5,7 @@
 
 #include "document/TShadow.h"
 #include "library/ThumbnailRender.h"
+#include "tests/support/Patience.h"
 
 #include <QElapsedTimer>
 #include <QRegularExpression>
@@ -68,7 +69,8 @@ private:
     {
         ThumbnailRender render;
         render.makeThumbnail(&archive, true);
-        const bool finished = QTest::qWaitFor([&] { return render.makePictureThreadIsFinished(); }, 20000);
+        const bool finished =
+            QTest::qWaitFor([&] { return render.makePictureThreadIsFinished(); }, PATIENCE_MS);
         const QFileInfo title(QString::fromStdString(archive.getPath()));
         return finished ? QImage(title.path() + QLatin1Char('/') + title.completeBaseName() +
                                  QLatin1String(suffix))
@@ -248,7 +250,7 @@ void tst_thumbnailrender::slowStageWritesFourFiles()
     ThumbnailRender render;
     QSignalSpy spy(&render, &IThumbnailRender::saveHalfThumbnailsOK);
     render.makeThumbnail(archive.get(), true);
-    QTRY_VERIFY_WITH_TIMEOUT(render.makePictureThreadIsFinished(), 20000);
+    QTRY_VERIFY(render.makePictureThreadIsFinished());
     QCOMPARE(spy.count(), 0);
     QCOMPARE(reports.take(), (Reports{{1, QStringLiteral("t")}}));
     QCOMPARE(QImage(folder + QStringLiteral("/t_1920.png")).size(), QSize(1920, 1080));
@@ -271,7 +273,7 @@ void tst_thumbnailrender::slowStageReplacesTheOldBigPicture()
         const FullDisk disk;
         render.makeThumbnail(archive.get(), true);
         QCOMPARE(QImage(picture).size(), QSize(10, 10)); // on air until the new one is there
-        QTRY_VERIFY_WITH_TIMEOUT(render.makePictureThreadIsFinished(), 20000);
+        QTRY_VERIFY(render.makePictureThreadIsFinished());
         QCOMPARE(QImage(picture).size(), QSize(10, 10));
     }
     QCOMPARE(slowPicture(*archive, "_1920.png").size(), QSize(1920, 1080));
@@ -307,7 +309,7 @@ void tst_thumbnailrender::slowStageReplacesNothingElse()
     ThumbnailRender render;
     render.makeThumbnail(archive.get(), true);
     QVERIFY(QFile::exists(named));
-    QTRY_VERIFY_WITH_TIMEOUT(render.makePictureThreadIsFinished(), 20000);
+    QTRY_VERIFY(render.makePictureThreadIsFinished());
     QVERIFY(file.open(QIODevice::ReadOnly));
     QCOMPARE(file.readAll(), before);
     QVERIFY(QFile::exists(folder + QStringLiteral("/t_960.png")));
@@ -328,7 +330,7 @@ void tst_thumbnailrender::slowStageDrawsWhileTheEventsGoOn()
         wanted.append({1, name});
     }
     Reports seen;
-    QTRY_COMPARE_WITH_TIMEOUT((seen += reports.take()).size(), wanted.size(), 20000);
+    QTRY_COMPARE((seen += reports.take()).size(), wanted.size());
     QCOMPARE(seen, wanted);
     QCOMPARE(QImage(folder + QStringLiteral("/b_1920.png")).pixelColor(5, 5), QColor(20, 90, 40));
     QCOMPARE(QImage(folder + QStringLiteral("/c_1920.png")).pixelColor(5, 5).alpha(), 0);

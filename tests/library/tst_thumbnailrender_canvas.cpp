@@ -2,6 +2,7 @@
 #include "tests/canvas/StyleProperties.h"
 
 #include "library/ThumbnailRender.h"
+#include "tests/support/Patience.h"
 
 #include <QPainter>
 
@@ -67,7 +68,7 @@ tst_thumbnailrender_canvas::Pictures tst_thumbnailrender_canvas::picturesOf(cons
                      [&pictures](const QString&, const QImage& image) { pictures.list = image; });
     render.makeThumbnail(saved.get(), false);
     render.makeThumbnail(saved.get(), true);
-    if (QTest::qWaitFor([&render] { return render.makePictureThreadIsFinished(); }, 20000))
+    if (QTest::qWaitFor([&render] { return render.makePictureThreadIsFinished(); }, PATIENCE_MS))
         pictures.air = QImage(canvas.folder.path() + "/title_1920.png");
     return pictures;
 }

@@ -10,6 +10,7 @@
 #include "messaging/ptc/RemoteReceiver.h"
 #include "messaging/ptc/RemoteSender.h"
 #include "tests/messaging/RecordingAdapter.h"
+#include "tests/support/Patience.h"
 
 #include <QCoreApplication>
 #include <QTest>

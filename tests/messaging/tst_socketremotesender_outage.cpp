@@ -5,6 +5,7 @@
 #include "support/LogManager.h"
 #include "tests/messaging/TestPorts.h"
 #include "tests/messaging/TestSocket.h"
+#include "tests/support/Patience.h"
 
 #include <QElapsedTimer>
 #include <QFile>

@@ -1,5 +1,6 @@
 // The palette: its colours, what a choice, OK and Cancel send, and where a finger can move it.
 #include "PanelFixture.h"
+#include "tests/support/Patience.h"
 
 #include "panel/ColorButton.h"
 #include "panel/ColorPalette.h"
@@ -52,7 +53,7 @@ void tst_colorpalette::init()
     m_sent = std::make_unique<QSignalSpy>(m_palette.get(), &ColorPalette::sendColorValue);
     m_palette->move(100, 100);
     m_palette->show();
-    QVERIFY(QTest::qWaitForWindowExposed(m_palette.get()));
+    QVERIFY(QTest::qWaitForWindowExposed(m_palette.get(), PATIENCE_MS));
 }
 
 void tst_colorpalette::cleanup()

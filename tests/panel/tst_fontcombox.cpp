@@ -1,5 +1,6 @@
 // The font box: which families it offers, under which names, and what it makes of imported files.
 #include "PanelFixture.h"
+#include "tests/support/Patience.h"
 
 #include "panel/FamilyToolBox.h"
 #include "panel/FontCombox.h"
@@ -64,7 +65,7 @@ void tst_fontcombox::init()
     m_box = new FamilyToolBox(m_window.get());
     m_box->move(20, 700);
     m_window->show();
-    QVERIFY(QTest::qWaitForWindowActive(m_window.get()));
+    QVERIFY(QTest::qWaitForWindowActive(m_window.get(), PATIENCE_MS));
 }
 
 void tst_fontcombox::cleanup()

@@ -1,5 +1,6 @@
 // The size box: its list, its ladder from mixed selections, and what becomes of what is typed in it.
 #include "PanelFixture.h"
+#include "tests/support/Patience.h"
 
 #include "panel/ComboxLineEditRegExpValidator.h"
 #include "panel/SizeBoxLineEdit.h"
@@ -87,7 +88,7 @@ void tst_sizetoolbox::init()
     m_box->setWidgetDisabled();
     m_box->setWidgetEnabled();
     m_window->show();
-    QVERIFY(QTest::qWaitForWindowActive(m_window.get()));
+    QVERIFY(QTest::qWaitForWindowActive(m_window.get(), PATIENCE_MS));
     m_environment->messages.posted.clear();
 }
 

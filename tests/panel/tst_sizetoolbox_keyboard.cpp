@@ -1,5 +1,6 @@
 // The size box and the soft keyboard: asked for by a tap into the field, and put away by whatever leaves it.
 #include "PanelFixture.h"
+#include "tests/support/Patience.h"
 
 #include "panel/SizeBoxLineEdit.h"
 #include "panel/SizeToolBox.h"
@@ -68,7 +69,7 @@ void tst_sizetoolbox_keyboard::init()
     m_box->setFontSize({64, 64});
     m_other = new QLineEdit(m_window.get());
     m_window->show();
-    QVERIFY(QTest::qWaitForWindowActive(m_window.get()));
+    QVERIFY(QTest::qWaitForWindowActive(m_window.get(), PATIENCE_MS));
     m_service.calls.clear();
     m_service.shown.clear();
 }

@@ -1,5 +1,6 @@
 // The panel as a whole: what reaches the canvas and the log, what a selection shows, who is enabled when.
 #include "PanelFixture.h"
+#include "tests/support/Patience.h"
 
 #include "document/SettingManager.h"
 #include "panel/AlignToolBox.h"
@@ -75,7 +76,7 @@ void tst_texttoolspanel::init()
     QFile::remove(QString::fromStdWString(IPathManagerEx::getInstance()->getSystemSettingPath()) +
                   QString::fromLatin1(SettingManager::SETTING_FILENAME));
     m_panel = std::make_unique<Panel>(*m_environment);
-    QVERIFY(QTest::qWaitForWindowActive(&m_panel->window));
+    QVERIFY(QTest::qWaitForWindowActive(&m_panel->window, PATIENCE_MS));
 }
 
 void tst_texttoolspanel::cleanup()

@@ -1,5 +1,6 @@
 // The panel's palette: what a chosen colour sends, what Cancel gives back, and what cancels it by itself.
 #include "PanelFixture.h"
+#include "tests/support/Patience.h"
 
 #include "panel/ColorButton.h"
 #include "panel/ColorPalette.h"
@@ -32,7 +33,7 @@ private:
 void tst_texttoolspanel_palette::init()
 {
     m_panel = std::make_unique<Panel>(*m_environment);
-    QVERIFY(QTest::qWaitForWindowActive(&m_panel->window));
+    QVERIFY(QTest::qWaitForWindowActive(&m_panel->window, PATIENCE_MS));
 }
 
 void tst_texttoolspanel_palette::textPaletteOk()

@@ -1,5 +1,6 @@
 // The tool boxes by themselves: what their buttons emit, how they look, what they keep.
 #include "PanelFixture.h"
+#include "tests/support/Patience.h"
 
 #include "panel/AlignToolBox.h"
 #include "panel/BoldToolBox.h"
@@ -64,7 +65,7 @@ private:
         m_window->show();
         box->setWidgetDisabled();
         box->setWidgetEnabled();
-        [&] { QVERIFY(QTest::qWaitForWindowExposed(m_window.get())); }();
+        [&] { QVERIFY(QTest::qWaitForWindowExposed(m_window.get(), PATIENCE_MS)); }();
         return box;
     }
     KSPushbutton* button(const char* name) const
@@ -290,7 +291,7 @@ void tst_toolbox::edgeSliderDragIsOneStep()
     QCOMPARE(shown, (QList<QVariantList>{{true}}));
     // A finger drags the handle to the right end.
     KSSLider* slider = box->slider()->slider();
-    QVERIFY(QTest::qWaitForWindowExposed(box->slider()));
+    QVERIFY(QTest::qWaitForWindowExposed(box->slider(), PATIENCE_MS));
     const QPoint handle = slider->handleRect().center();
     QTest::touchEvent(slider, m_environment->device).press(0, handle, slider);
     for (int x = handle.x(); x < slider->width() + 40; x += 20)
@@ -368,7 +369,7 @@ void tst_toolbox::edgeSliderHasNoCorners()
 {
     auto* edge = show<EdgeToolBox>();
     edge->slider()->popup(QPoint(100, 100));
-    QVERIFY(QTest::qWaitForWindowExposed(edge->slider()));
+    QVERIFY(QTest::qWaitForWindowExposed(edge->slider(), PATIENCE_MS));
     QVERIFY(!edge->slider()->mask().contains(QPoint(0, 0)));
     QVERIFY(!edge->slider()->mask().contains(edge->slider()->rect().bottomRight()));
     QCOMPARE(edge->slider()->mask().boundingRect(), edge->slider()->rect());

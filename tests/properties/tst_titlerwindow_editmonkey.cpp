@@ -10,6 +10,7 @@
 #include "tests/app/Siblings.h"
 #include "tests/canvas/StyleProperties.h"
 #include "tests/library/LibraryFixture.h"
+#include "tests/support/Patience.h"
 #include "tests/support/RandomSeed.h"
 #include "tests/touchui/TouchDevice.h"
 
@@ -173,7 +174,7 @@ void tst_titlerwindow_editmonkey::manyTouches()
     const QString folder = writeFolder();
     const QString path = folder + "/title.xml";
     mWindow->showTitlerWindow({_titler_paramter::CREATE_OR_EDIT, path.toStdWString()});
-    QVERIFY(QTest::qWaitForWindowExposed(mWindow));
+    QVERIFY(QTest::qWaitForWindowExposed(mWindow, PATIENCE_MS));
     QCOMPARE(scene()->getTextItemList().size(), 2);
     MonkeyGround::Application::instance()->frozen = true;
     QElapsedTimer clock;

@@ -20,6 +20,7 @@
 #include "messaging/services/ServiceFamilies.h"
 #include "tests/app/Siblings.h"
 #include "tests/library/TemplateFixture.h"
+#include "tests/support/Patience.h"
 #include "tests/support/RandomSeed.h"
 #include "touchui/KSInputContext.h"
 #include "touchui/KSPushbutton.h"
@@ -636,7 +637,7 @@ bool tst_titlerwindow_library::closeAndReopen()
 
 bool tst_titlerwindow_library::waitForPictures()
 {
-    CHECK(QTest::qWaitFor([this] { return mScene->isEditFinish(); }, 60000));
+    CHECK(QTest::qWaitFor([this] { return mScene->isEditFinish(); }, PATIENCE_MS));
     return true;
 }
 
@@ -759,7 +760,7 @@ bool tst_titlerwindow_library::verifyPictures()
 bool tst_titlerwindow_library::verifyNotices()
 {
     const QSet<QString> wanted(mModel.order.begin(), mModel.order.end());
-    const bool agree = QTest::qWaitFor([this, &wanted] { return toldTitles() == wanted; }, 20000);
+    const bool agree = QTest::qWaitFor([this, &wanted] { return toldTitles() == wanted; }, PATIENCE_MS);
     CHECK(agree);
     return true;
 }

@@ -12,6 +12,7 @@
 #include "tests/app/Siblings.h"
 #include "tests/canvas/CanvasTestTools.h"
 #include "tests/fakes/FakeTitlerCallBack.h"
+#include "tests/support/Patience.h"
 #include "tests/support/RandomSeed.h"
 #include "tests/touchui/TouchDevice.h"
 #include "touchui/CustomTreeDelegete.h"
@@ -45,7 +46,6 @@ constexpr int TouchesPerFrame = 16;
 constexpr int TouchesPerGlance = 40; // at what is shown
 constexpr int TouchesPerLook = 1000; // at what is on disk
 constexpr int LooksPerPicture = 5;   // read the pictures, too
-constexpr int SaveTimeout = 60000;
 
 const char* const MustHappen[] = {"titles made",
                                   "titles pasted",
@@ -410,7 +410,7 @@ void tst_titlerwindow_monkey::manyTouches()
     QVERIFY2(held.isEmpty(), qPrintable(held + '\n' + mFingers->lastTouches().join('\n')));
 
     if (mWindow->isVisible()) {
-        QTRY_VERIFY_WITH_TIMEOUT(mWindow->dataSaveIsFinished(), SaveTimeout);
+        QTRY_VERIFY(mWindow->dataSaveIsFinished());
         mWindow->closeTitlerWindow();
         if (mWindow->isVisible())
             mWindow->continueCloseTitler({1, MessageDefine::CLOSE_OK, MessageDef::MESSAGE_CONFIRM_CLOSE});

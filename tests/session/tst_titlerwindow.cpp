@@ -23,6 +23,7 @@
 #include "tests/app/Siblings.h"
 #include "tests/library/LibraryFixture.h"
 #include "tests/support/LogFixture.h"
+#include "tests/support/Patience.h"
 #include "tests/touchui/TouchDevice.h"
 #include "touchui/KSInputContext.h"
 #include "touchui/KSPushbutton.h"
@@ -313,7 +314,7 @@ void tst_titlerwindow::closeWhileFingersRestOnTitles()
     const QPoint onClose = close->mapTo(mWindow, close->rect().center());
     for (int session = 0; session < 4; ++session) {
         request(folder);
-        QVERIFY(QTest::qWaitForWindowExposed(mWindow));
+        QVERIFY(QTest::qWaitForWindowExposed(mWindow, PATIENCE_MS));
         QCOMPARE(list()->count(), 5);
         const QPointer<ArchiveItem> item = list()->archiveItem(0);
         QWindow* window = mWindow->windowHandle();
@@ -403,7 +404,7 @@ void tst_titlerwindow::focusCommandLeavesACleanStackClean()
 void tst_titlerwindow::moveModeEatsPressesOutsideTheList()
 {
     request(writeFolder("moving", {"t1"}));
-    QVERIFY(QTest::qWaitForWindowExposed(mWindow));
+    QVERIFY(QTest::qWaitForWindowExposed(mWindow, PATIENCE_MS));
     KSPushbutton* move = nullptr;
     for (KSPushbutton* button : mWindow->findChildren<KSPushbutton*>()) {
         if (button->text() == "Move")

@@ -15,6 +15,7 @@
 #include "tests/app/Siblings.h"
 #include "tests/fakes/FakeTitlerCallBack.h"
 #include "tests/library/LibraryFixture.h"
+#include "tests/support/Patience.h"
 #include "tests/touchui/TouchDevice.h"
 #include "touchui/KSInputContext.h"
 
@@ -30,11 +31,9 @@
 namespace
 {
 
-constexpr int ROW = 143;           // of the list, with the gap
-constexpr int HANDLE_X = 523;      // in the list
-constexpr int PICTURE_X = 150;     // likewise
-constexpr int LIFT_TIMEOUT = 5000; // ms
-constexpr int REPORT_TIMEOUT = 5000;
+constexpr int ROW = 143;       // of the list, with the gap
+constexpr int HANDLE_X = 523;  // in the list
+constexpr int PICTURE_X = 150; // likewise
 const long FILE_MANAGER = 36;
 const long UPDATE_TITLER_STATUS = 72;
 const char* const PICTURES[] = {"_1920.png", "_960.png", "_240.png", "_240S.png"};
@@ -251,7 +250,7 @@ void tst_titlerwindow_closing::closeOverTheQuestion()
 void tst_titlerwindow_closing::begin(Ending ending)
 {
     mWindow->showTitlerWindow({_titler_paramter::CREATE_OR_EDIT, mFolder.toStdWString()});
-    QVERIFY(QTest::qWaitForWindowActive(mWindow.get()));
+    QVERIFY(QTest::qWaitForWindowActive(mWindow.get(), PATIENCE_MS));
     QTRY_VERIFY(list()->archiveItem(2) && list()->archiveItem(2)->hasChildWidgets());
     QCOMPARE(stems(), mOrder);
     EditContextController* context = EditContextController::getInstance();
@@ -284,7 +283,7 @@ void tst_titlerwindow_closing::verifyReports()
         }
         return stems.contains(QSet<QString>(mChanged.cbegin(), mChanged.cend()));
     };
-    const QDeadlineTimer limit(REPORT_TIMEOUT);
+    const QDeadlineTimer limit(PATIENCE_MS);
     while (!reported() && !limit.hasExpired())
         QThread::msleep(5);
     QVERIFY(reported());
@@ -358,7 +357,7 @@ void tst_titlerwindow_closing::enter(State state)
         break;
     case MenuOpen:
         finger(QEventPoint::Pressed, list(), QPoint(PICTURE_X, ROW + 60));
-        QTRY_VERIFY_WITH_TIMEOUT(list()->IsOptionMenuShowing(), LIFT_TIMEOUT);
+        QTRY_VERIFY(list()->IsOptionMenuShowing());
         break;
     case PicturesOnTheirWay:
         for (int row = 0; row < list()->count(); ++row) {
@@ -455,7 +454,7 @@ void tst_titlerwindow_closing::carryTitle()
 {
     mWindow->editAndDoneButtonClicked();
     finger(QEventPoint::Pressed, list(), QPoint(HANDLE_X, 65));
-    QTRY_VERIFY_WITH_TIMEOUT(list()->getMoveState(), LIFT_TIMEOUT);
+    QTRY_VERIFY(list()->getMoveState());
     for (int step = 1; step <= 8; ++step)
         finger(QEventPoint::Updated, list(), QPoint(HANDLE_X, 65 + ROW * step / 8));
     mOrder.move(0, 1);

@@ -9,6 +9,7 @@
 #include "tests/app/Siblings.h"
 #include "tests/fakes/FakeInputMethod.h"
 #include "tests/library/LibraryFixture.h"
+#include "tests/support/Patience.h"
 #include "touchui/KSInputContext.h"
 #include "touchui/KSPushbutton.h"
 
@@ -71,7 +72,7 @@ void tst_titlerwindow_composition::init()
     mFolder = mFixture.makeFolder(QStringLiteral("composition"));
     LibraryFixture::fillFolder(mFolder, {"a", "b"});
     mWindow->showTitlerWindow({_titler_paramter::CREATE_OR_EDIT, mFolder.toStdWString()});
-    QVERIFY(QTest::qWaitForWindowActive(mWindow.get()));
+    QVERIFY(QTest::qWaitForWindowActive(mWindow.get(), PATIENCE_MS));
     QTRY_VERIFY(list()->archiveItem(1) && list()->archiveItem(1)->hasChildWidgets());
 }
 

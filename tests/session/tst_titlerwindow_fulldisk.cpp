@@ -17,6 +17,7 @@
 #include "tests/library/LibraryFixture.h"
 #include "tests/support/FullDisk.h"
 #include "tests/support/LogFixture.h"
+#include "tests/support/Patience.h"
 #include "touchui/KSInputContext.h"
 
 #include <QApplication>
@@ -30,9 +31,6 @@
 
 namespace
 {
-
-constexpr int RETRY_TIMEOUT = 15000; // ms; refused writes are tried again every 5 s
-constexpr int SYNC_TIMEOUT = 20000;  // ms; what is not synced is logged after 10 s
 
 std::mutex gMutex;
 std::condition_variable gGoesOn;
@@ -186,7 +184,7 @@ void tst_titlerwindow_fulldisk::init()
     LibraryFixture::fillFolder(mFolder, {"a", "b", "c"});
     mSiblings.forget();
     mWindow->showTitlerWindow({_titler_paramter::CREATE_OR_EDIT, mFolder.toStdWString()});
-    QVERIFY(QTest::qWaitForWindowActive(mWindow.get()));
+    QVERIFY(QTest::qWaitForWindowActive(mWindow.get(), PATIENCE_MS));
     QTRY_VERIFY(list()->archiveItem(2) && list()->archiveItem(2)->hasChildWidgets());
     QTRY_VERIFY(scene()->isEditFinish());
 }
@@ -238,8 +236,8 @@ void tst_titlerwindow_fulldisk::cancelKeepsTheSession()
         QCOMPARE(textOnDisk("a"), QStringLiteral("a"));
     }
     // Nobody does anything.
-    QTRY_COMPARE_WITH_TIMEOUT(textOnDisk("a"), QStringLiteral("a!?"), RETRY_TIMEOUT);
-    QTRY_VERIFY_WITH_TIMEOUT(RefusedWrites::isEmpty(), RETRY_TIMEOUT);
+    QTRY_COMPARE(textOnDisk("a"), QStringLiteral("a!?"));
+    QTRY_VERIFY(RefusedWrites::isEmpty());
     QCOMPARE(boxes(114).size(), 1);
     mWindow->closeTitlerWindow();
     QVERIFY(!mWindow->isVisible());
@@ -321,7 +319,7 @@ void tst_titlerwindow_fulldisk::slowDiskKeepsNobodyWaiting()
             lines += mLog.takeDebugLines("TitlerWindow").join('\n');
             return lines.contains("not yet on the disk: " + mFolder);
         };
-        QTRY_VERIFY2_WITH_TIMEOUT(isLogged(), qPrintable(lines), SYNC_TIMEOUT);
+        QTRY_VERIFY2(isLogged(), qPrintable(lines));
     }
     QVERIFY(FileSyncQueue::flush(std::chrono::seconds(30)));
 }

@@ -15,6 +15,7 @@
 #include "tests/app/Siblings.h"
 #include "tests/gallery/Interruptions.h"
 #include "tests/library/TemplateFixture.h"
+#include "tests/support/Patience.h"
 #include "touchui/KSInputContext.h"
 #include "touchui/KSMenu.h"
 #include "touchui/KSTreeModel.h"
@@ -69,7 +70,7 @@ void tst_titlerwindow_interruptions::initTestCase()
     pMainWindow = mWindow;
     mWindow->setRealClose(false);
     mWindow->showTitlerWindow({_titler_paramter::CREATE_OR_EDIT, folder.toStdWString()});
-    QVERIFY(QTest::qWaitForWindowExposed(mWindow));
+    QVERIFY(QTest::qWaitForWindowExposed(mWindow, PATIENCE_MS));
     const auto* list = mWindow->findChild<ArchiveList*>();
     QTRY_COMPARE(list->count(), 12);
     QTRY_VERIFY(list->archiveItem(11)->hasChildWidgets());

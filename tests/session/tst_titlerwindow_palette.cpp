@@ -15,6 +15,7 @@
 #include "panel/TextToolsPanel.h"
 #include "tests/app/Siblings.h"
 #include "tests/library/LibraryFixture.h"
+#include "tests/support/Patience.h"
 #include "tests/touchui/TouchDevice.h"
 #include "touchui/KSInputContext.h"
 #include "touchui/KSSLider.h"
@@ -144,7 +145,7 @@ void tst_titlerwindow_palette::init()
     LibraryFixture::writeOrder(mFolder, {QStringLiteral("a"), QStringLiteral("b")});
 
     mWindow->showTitlerWindow({_titler_paramter::CREATE_OR_EDIT, mFolder.toStdWString()});
-    QVERIFY(QTest::qWaitForWindowActive(mWindow.get()));
+    QVERIFY(QTest::qWaitForWindowActive(mWindow.get(), PATIENCE_MS));
     QTRY_VERIFY(find<ArchiveList>()->archiveItem(1) &&
                 find<ArchiveList>()->archiveItem(1)->hasChildWidgets());
     QCOMPARE(scene()->getTextItemList().size(), 2);

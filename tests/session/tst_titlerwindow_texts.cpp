@@ -20,6 +20,7 @@
 #include "tests/fakes/FakeTitlerCallBack.h"
 #include "tests/library/LibraryFixture.h"
 #include "tests/properties/SoftKeyboardStandIn.h"
+#include "tests/support/Patience.h"
 #include "tests/touchui/TouchDevice.h"
 #include "touchui/KSInputContext.h"
 #include "touchui/KSPushbutton.h"
@@ -197,7 +198,7 @@ void tst_titlerwindow_texts::init()
 void tst_titlerwindow_texts::show()
 {
     mWindow->showTitlerWindow({_titler_paramter::CREATE_OR_EDIT, mFolder.toStdWString()});
-    QVERIFY(QTest::qWaitForWindowActive(mWindow.get()));
+    QVERIFY(QTest::qWaitForWindowActive(mWindow.get(), PATIENCE_MS));
     QTRY_VERIFY(list()->archiveItem(2) && list()->archiveItem(2)->hasChildWidgets());
     QCOMPARE(QFileInfo(list()->getSelectedArchive()->getArchiveDataPath()).completeBaseName(),
              QStringLiteral("a"));

@@ -14,6 +14,7 @@
 #include "library/TemplateTab.h"
 #include "tests/app/Siblings.h"
 #include "tests/library/TemplateFixture.h"
+#include "tests/support/Patience.h"
 #include "touchui/KSInputContext.h"
 #include "touchui/KSPushbutton.h"
 

@@ -3,6 +3,7 @@
 #include "app/TitlerWindow.h"
 #include "library/ArchiveList.h"
 #include "tests/app/Siblings.h"
+#include "tests/support/Patience.h"
 #include "touchui/KSInputContext.h"
 #include "touchui/KSPushbutton.h"
 
@@ -72,7 +73,7 @@ void tst_windowlanguage::missingTranslationLeavesTheLanguage()
 void tst_windowlanguage::listKeepsItsPlace()
 {
     mWindow->show();
-    QVERIFY(QTest::qWaitForWindowExposed(mWindow.get()));
+    QVERIFY(QTest::qWaitForWindowExposed(mWindow.get(), PATIENCE_MS));
     const auto* list = mWindow->findChild<ArchiveList*>();
     for (const auto language :
          {SystemSetupDef::emSystemLanguageEnglish, SystemSetupDef::emSystemLanguageChinese}) {

@@ -1,6 +1,7 @@
 // Bytes that the disk refused: kept, read in place of the file, written when there is room, and moved or
 // forgotten with their folder.
 #include "FullDisk.h"
+#include "Patience.h"
 
 #include "support/AtomicFile.h"
 #include "support/FileSyncQueue.h"

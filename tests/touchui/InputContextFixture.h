@@ -3,6 +3,7 @@
 #include "messaging/services/SubCommonDefine.h"
 #include "tests/fakes/FakeInputMethod.h"
 #include "tests/fakes/FakeSoftKeyBoardController.h"
+#include "tests/support/Patience.h"
 #include "touchui/KSAppEventFilter.h"
 #include "touchui/KSInputContext.h"
 #include "touchui/KSInputFocusManager.h"
@@ -132,7 +133,7 @@ inline void InputContextFixture::init()
     }
     m_window->show();
     m_window->activateWindow();
-    QVERIFY(QTest::qWaitForWindowActive(m_window.get()));
+    QVERIFY(QTest::qWaitForWindowActive(m_window.get(), PATIENCE_MS));
     m_button->setFocus();
     m_service->calls.clear();
 }

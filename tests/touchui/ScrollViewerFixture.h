@@ -2,6 +2,7 @@
 
 #include "TouchDevice.h"
 #include "tests/fakes/ManualClock.h"
+#include "tests/support/Patience.h"
 #include "touchui/KSAppEventFilter.h"
 #include "touchui/KSBaseItemWidget.h"
 #include "touchui/KSEventDefaultMutexLockObject.h"
@@ -56,7 +57,7 @@ public:
         KSScrollViewerWidget::s_mainWnd = &mWindow;
         record();
         mWindow.show();
-        if (!QTest::qWaitForWindowExposed(&mWindow))
+        if (!QTest::qWaitForWindowExposed(&mWindow, PATIENCE_MS))
             qFatal("no window");
     }
     ~ScrollViewerFixture() override

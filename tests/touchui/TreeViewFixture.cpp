@@ -1,4 +1,5 @@
 #include "TreeViewFixture.h"
+#include "tests/support/Patience.h"
 
 void TreeViewFixture::initTestCase()
 {
@@ -20,7 +21,7 @@ void TreeViewFixture::init()
     m_tree->resize(802, 570);
     m_tree->header()->resizeSection(0, 520);
     m_tree->show();
-    QVERIFY(QTest::qWaitForWindowExposed(m_tree.get()));
+    QVERIFY(QTest::qWaitForWindowExposed(m_tree.get(), PATIENCE_MS));
     m_area = m_tree->viewport();
 }
 

@@ -1,4 +1,5 @@
 // The balloons: the tool tip of sliders and rows, and those of buttons and prompts.
+#include "tests/support/Patience.h"
 #include "touchui/Balloon.h"
 #include "touchui/BalloonWindow.h"
 #include "touchui/KSToolTip.h"
@@ -53,7 +54,7 @@ void tst_balloon::init()
     m_anchor = new QWidget(m_window.get());
     m_anchor->setGeometry(300, 300, 100, 50);
     m_window->show();
-    QVERIFY(QTest::qWaitForWindowExposed(m_window.get()));
+    QVERIFY(QTest::qWaitForWindowExposed(m_window.get(), PATIENCE_MS));
     KSToolTip::s_mainWindow = m_window.get();
     Balloon::s_ParentWindow = m_window.get();
 }

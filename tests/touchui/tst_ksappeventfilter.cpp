@@ -2,6 +2,7 @@
 #include "TouchDevice.h"
 #include "tests/fakes/FakeTitlerAPPEventFilterController.h"
 #include "tests/fakes/ManualClock.h"
+#include "tests/support/Patience.h"
 #include "touchui/KSAppEventFilter.h"
 #include "touchui/KSEventClusterLockObject.h"
 #include "touchui/KSEventDefaultMutexLockObject.h"
@@ -128,7 +129,7 @@ void tst_ksappeventfilter::init()
     m_second = new TouchEventButton(QStringLiteral("second"), m_window.get());
     m_second->setGeometry(200, 10, 100, 60);
     m_window->show();
-    QVERIFY(QTest::qWaitForWindowExposed(m_window.get()));
+    QVERIFY(QTest::qWaitForWindowExposed(m_window.get(), PATIENCE_MS));
 }
 
 void tst_ksappeventfilter::cleanup()
@@ -362,7 +363,7 @@ void tst_ksappeventfilter::aVanishedHolderIsCutOff()
     auto* gone = new TouchEventButton;
     gone->setGeometry(600, 400, 100, 100);
     gone->show();
-    QVERIFY(QTest::qWaitForWindowExposed(gone));
+    QVERIFY(QTest::qWaitForWindowExposed(gone, PATIENCE_MS));
     QTest::touchEvent(gone, m_device).press(0, QPoint(20, 20));
     QVERIFY(gone->isDown());
     delete gone;
@@ -455,14 +456,14 @@ void tst_ksappeventfilter::anIgnoredTouchFreesTheLock()
     ground.setAttribute(Qt::WA_AcceptTouchEvents);
     ground.setGeometry(600, 400, 100, 100);
     ground.show();
-    QVERIFY(QTest::qWaitForWindowExposed(&ground));
+    QVERIFY(QTest::qWaitForWindowExposed(&ground, PATIENCE_MS));
     QSignalSpy clicked(m_first, &QAbstractButton::clicked);
     QTest::touchEvent(&ground, m_device).press(0, QPoint(50, 50));
     QVERIFY(m_filter->isLock(nullptr, LOCKMETHOD_TOUCH));
     QTest::touchEvent(&ground, m_device).press(1, QPoint(20, 20)).stationary(0);
     QTest::touchEvent(&ground, m_device).release(0, QPoint(50, 50)).stationary(1);
     QTest::touchEvent(&ground, m_device).release(1, QPoint(20, 20));
-    QTRY_VERIFY_WITH_TIMEOUT(!m_filter->isLock(nullptr, LOCKMETHOD_TOUCH), 1000);
+    QTRY_VERIFY(!m_filter->isLock(nullptr, LOCKMETHOD_TOUCH));
     touch(m_first, 0);
     QCoreApplication::processEvents();
     QVERIFY(m_filter->isLock(nullptr, LOCKMETHOD_TOUCH));

@@ -1,5 +1,6 @@
 // The combo box and its list.
 #include "tests/fakes/ManualClock.h"
+#include "tests/support/Patience.h"
 #include "tests/touchui/TouchFixture.h"
 #include "touchui/CustomComboBoxDelegate.h"
 #include "touchui/CustomComboBoxView.h"
@@ -66,7 +67,7 @@ private:
     {
         m_box->showPopup();
         QVERIFY(m_box->isPopupVisible());
-        QVERIFY(QTest::qWaitForWindowExposed(m_box->listView()->window()));
+        QVERIFY(QTest::qWaitForWindowExposed(m_box->listView()->window(), PATIENCE_MS));
     }
 
     std::unique_ptr<ManualClock> m_clock;
@@ -90,7 +91,7 @@ void tst_kscombobox::init()
     m_box->setGeometry(20, 20, 200, 48);
     fill(5);
     m_window->show();
-    QVERIFY(QTest::qWaitForWindowExposed(m_window.get()));
+    QVERIFY(QTest::qWaitForWindowExposed(m_window.get(), PATIENCE_MS));
 }
 
 void tst_kscombobox::cleanup()

@@ -1,6 +1,7 @@
 // What the soft keyboard service sends to fields.
 #include "support/LogManager.h"
 #include "tests/support/LogFixture.h"
+#include "tests/support/Patience.h"
 #include "tests/touchui/InputContextFixture.h"
 
 using namespace SubCommonDefine;

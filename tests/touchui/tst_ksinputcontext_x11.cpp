@@ -1,5 +1,6 @@
 // The input context on an X server: keys that really come from one. Run under Xvfb.
 #include "tests/fakes/FakeSoftKeyBoardController.h"
+#include "tests/support/Patience.h"
 #include "touchui/KSAppEventFilter.h"
 #include "touchui/KSInputContext.h"
 #include "touchui/KSInputFocusManager.h"

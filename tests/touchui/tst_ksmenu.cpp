@@ -1,4 +1,5 @@
 // The balloon menu: placed, tapped, closed.
+#include "tests/support/Patience.h"
 #include "tests/touchui/TouchFixture.h"
 #include "touchui/KSMenu.h"
 #include "touchui/TouchEventButton.h"
@@ -42,7 +43,7 @@ private:
     void open(const QPoint& anchor = QPoint(300, 100))
     {
         m_menu->popup(m_window->mapToGlobal(anchor));
-        QVERIFY(QTest::qWaitForWindowExposed(m_menu));
+        QVERIFY(QTest::qWaitForWindowExposed(m_menu, PATIENCE_MS));
     }
 
     std::unique_ptr<TouchFixture> m_touch;
@@ -61,7 +62,7 @@ void tst_ksmenu::init()
     m_button = new TouchEventButton(QStringLiteral("under"), m_window.get());
     m_button->setGeometry(10, 500, 200, 80);
     m_window->show();
-    QVERIFY(QTest::qWaitForWindowExposed(m_window.get()));
+    QVERIFY(QTest::qWaitForWindowExposed(m_window.get(), PATIENCE_MS));
     KSMenu::setMainWindow(m_window.get());
     m_menu = new KSMenu(m_window.get());
     m_actions = {m_menu->addAction(QStringLiteral("Create New")), m_menu->addAction(QStringLiteral("Copy")),

@@ -1,5 +1,6 @@
 // Rows of a list, their order and places, the list's scroll bar, wheel and keys; what a row is made of.
 #include "ScrollViewerFixture.h"
+#include "tests/support/Patience.h"
 
 #include "TouchDevice.h"
 #include "touchui/KSScrollBar.h"
@@ -282,7 +283,7 @@ void tst_ksscrollviewerwidget_layout::barStaysInItsPlace()
     scroll(300);
     QCOMPARE(m->mList->getVScrollBar()->geometry(), place);
     m->mWindow.show();
-    QVERIFY(QTest::qWaitForWindowExposed(&m->mWindow));
+    QVERIFY(QTest::qWaitForWindowExposed(&m->mWindow, PATIENCE_MS));
     QCOMPARE(m->mList->getVScrollBar()->geometry(), place);
     m->mList->setUpdatesEnabled(false);
     scroll(m->maximum());

@@ -1,5 +1,6 @@
 // Rows of a list whose widgets are made when they come into view, and taken away again.
 #include "ScrollViewerFixture.h"
+#include "tests/support/Patience.h"
 
 #include "TouchDevice.h"
 

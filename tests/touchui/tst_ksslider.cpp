@@ -1,4 +1,5 @@
 // The slider under the finger and under the mouse.
+#include "tests/support/Patience.h"
 #include "tests/touchui/TouchFixture.h"
 #include "touchui/KSSLider.h"
 #include "touchui/KSSliderStyle.h"
@@ -67,7 +68,7 @@ void tst_ksslider::init()
     m_slider->setPageStep(2);
     m_slider->setGeometry(50, 100, 400, 60);
     m_window->show();
-    QVERIFY(QTest::qWaitForWindowExposed(m_window.get()));
+    QVERIFY(QTest::qWaitForWindowExposed(m_window.get(), PATIENCE_MS));
 }
 
 void tst_ksslider::cleanup()

@@ -1,4 +1,5 @@
 // Tabs and radio buttons under the finger.
+#include "tests/support/Patience.h"
 #include "tests/touchui/TouchFixture.h"
 #include "touchui/KSCommonStyle.h"
 #include "touchui/KSRadiobutton.h"
@@ -68,7 +69,7 @@ void tst_kstabbar::init()
     m_second->setGeometry(200, 0, 150, 50);
     m_first->setChecked(true);
     m_window->show();
-    QVERIFY(QTest::qWaitForWindowExposed(m_window.get()));
+    QVERIFY(QTest::qWaitForWindowExposed(m_window.get(), PATIENCE_MS));
 }
 
 void tst_kstabbar::cleanup()

@@ -1,5 +1,6 @@
 // The touch tree under real fingers and the mouse, through the application's filter.
 #include "TreeViewFixture.h"
+#include "tests/support/Patience.h"
 
 #include "tests/fakes/ManualClock.h"
 #include "touchui/KSEventMutexLockObject.h"
@@ -51,7 +52,7 @@ void tst_kstreeview::opensWithoutMakingHiddenChildren()
     model.createDataItems();
     tree.resize(802, 570);
     tree.show();
-    QVERIFY(QTest::qWaitForWindowExposed(&tree));
+    QVERIFY(QTest::qWaitForWindowExposed(&tree, PATIENCE_MS));
     tree.grab();
     tree.scrollToBottom();
     tree.grab();
@@ -179,7 +180,7 @@ void tst_kstreeview::flickGlidesOnAndComesToRest()
 {
     swipe(rowPoint(8), -30, 3);
     QVERIFY(m_tree->isAutoFilck());
-    QTRY_VERIFY_WITH_TIMEOUT(!m_tree->isAutoFilck(), 10000);
+    QTRY_VERIFY(!m_tree->isAutoFilck());
     const int value = m_tree->verticalScrollBar()->value();
     QVERIFY2(value > 60, qPrintable(QString::number(value)));
     QVERIFY(value < m_tree->verticalScrollBar()->maximum());
@@ -192,7 +193,7 @@ void tst_kstreeview::flickIntoTheEndShowsTheLastRowWhole()
 {
     swipe(rowPoint(10), -450, 3);
     QVERIFY(m_tree->isAutoFilck());
-    QTRY_VERIFY_WITH_TIMEOUT(!m_tree->isAutoFilck(), 10000);
+    QTRY_VERIFY(!m_tree->isAutoFilck());
     QScrollBar* bar = m_tree->verticalScrollBar();
     QCOMPARE(bar->value(), bar->maximum());
     QCOMPARE(m_tree->visualRect(m_model->index(39, 0)).bottom(), m_area->height() - 1);
@@ -337,7 +338,7 @@ void tst_kstreeview::hidingEndsEverything()
     m_tree->hide();
     QVERIFY(!m_tree->isAutoFilck());
     m_tree->show();
-    QVERIFY(QTest::qWaitForWindowExposed(m_tree.get()));
+    QVERIFY(QTest::qWaitForWindowExposed(m_tree.get(), PATIENCE_MS));
     QTest::touchEvent(m_area, m_device).press(0, rowPoint(2), m_area);
     m_tree->hide();
     QTest::qWait(100);

@@ -1,5 +1,6 @@
 // Editors, check boxes and marks in the rows of the touch tree, and what it paints.
 #include "TreeViewFixture.h"
+#include "tests/support/Patience.h"
 
 class tst_kstreeview_editing : public TreeViewFixture
 {

@@ -2,6 +2,7 @@
 #include "TouchFixture.h"
 #include "tests/fakes/ManualClock.h"
 
+#include "tests/support/Patience.h"
 #include "touchui/OneFinger.h"
 
 #include <QSignalSpy>
@@ -63,7 +64,7 @@ private Q_SLOTS:
         mTouch = std::make_unique<TouchFixture>();
         mPad = std::make_unique<Pad>();
         mPad->show();
-        QVERIFY(QTest::qWaitForWindowExposed(mPad.get()));
+        QVERIFY(QTest::qWaitForWindowExposed(mPad.get(), PATIENCE_MS));
         mCancelled = std::make_unique<QSignalSpy>(&mPad->finger, &OneFinger::cancelled);
     }
     void cleanup()

@@ -1,5 +1,6 @@
 // Buttons under the finger: real touch sequences through the window system.
 #include "TouchDevice.h"
+#include "tests/support/Patience.h"
 #include "touchui/KSPushbutton.h"
 #include "touchui/TouchEventButton.h"
 
@@ -107,7 +108,7 @@ void tst_toucheventbutton::init()
     m_button = new RecordingButton(QStringLiteral("One"), m_window.get());
     m_button->setGeometry(100, 100, 120, 60);
     m_window->show();
-    QVERIFY(QTest::qWaitForWindowExposed(m_window.get()));
+    QVERIFY(QTest::qWaitForWindowExposed(m_window.get(), PATIENCE_MS));
 }
 
 void tst_toucheventbutton::cleanup()

@@ -1,4 +1,5 @@
 // A window whose place the window system tells wrong.
+#include "tests/support/Patience.h"
 #include "touchui/WindowPlaceKeeper.h"
 
 #include <QDialog>
@@ -31,7 +32,7 @@ void tst_windowplacekeeper::init()
     new WindowPlaceKeeper(mDialog.get());
     mDialog->move(60, 40);
     mDialog->show();
-    QVERIFY(QTest::qWaitForWindowExposed(mDialog.get()));
+    QVERIFY(QTest::qWaitForWindowExposed(mDialog.get(), PATIENCE_MS));
     QCOMPARE(mDialog->windowHandle()->position(), QPoint(60, 40));
 }
 
