@@ -1,5 +1,6 @@
 // The folder picker in the main window: who opens it, where Cancel leads, what it does to the session, and
 // the notices of the file manager that reach it.
+#include "../support/Patience.h"
 #include "Siblings.h"
 #include "app/APPEventFilter.h"
 #include "app/EditContextController.h"
@@ -12,6 +13,7 @@
 #include "library/ArchiveList.h"
 #include "library/FolderPicker.h"
 #include "library/TemplatePicker.h"
+#include "support/FileSyncQueue.h"
 #include "tests/library/LibraryFixture.h"
 #include "touchui/KSInputContext.h"
 #include "touchui/KSPushbutton.h"
@@ -25,6 +27,7 @@
 #include <QTest>
 #include <QTextCursor>
 #include <QTimer>
+#include <chrono>
 #include <functional>
 
 class tst_folder_dialog : public QObject
@@ -119,7 +122,9 @@ void tst_folder_dialog::cleanupTestCase()
 
 void tst_folder_dialog::init()
 {
-    QDir(mFiles.titleRoot()).removeRecursively();
+    QVERIFY(FileSyncQueue::flush(
+        std::chrono::milliseconds(PATIENCE_MS))); // keeps versions in the folders until then
+    QVERIFY(QDir(mFiles.titleRoot()).removeRecursively());
     LibraryFixture::fillFolder(mFiles.makeFolder("news"), {"t1", "t2"});
     LibraryFixture::fillFolder(mFiles.makeFolder("sports"), {"t3"});
 }

@@ -11,6 +11,7 @@
 #include "document/TextStyle.h"
 #include "library/IEditContext.h"
 #include "library/ITitlerFolderReporter.h"
+#include "support/FileSyncQueue.h"
 
 #include <QDir>
 #include <QFile>
@@ -21,6 +22,7 @@
 #include <QPair>
 #include <QStringList>
 #include <QTemporaryDir>
+#include <chrono>
 #include <memory>
 #include <string>
 #include <vector>
@@ -63,6 +65,7 @@ public:
     QString makeFolder(const QString& name)
     {
         const QString path = titleRoot() + QLatin1Char('/') + name;
+        FileSyncQueue::flush(std::chrono::seconds(30)); // keeps versions in the folders until then
         QDir(path).removeRecursively();
         QDir().mkpath(path);
         return path;
