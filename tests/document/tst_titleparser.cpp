@@ -1,4 +1,5 @@
 // The title file and the order file of a folder.
+#include "../support/Patience.h"
 #include "document/Archive.h"
 #include "document/ArchiveOrder.h"
 #include "document/FolderTitles.h"
@@ -443,7 +444,7 @@ private Q_SLOTS:
         QCOMPARE(mParser.modifyClip(path("t.xml"), "1"), 0);
         QVERIFY(mParser.readFileOrderInFolder(folder()).empty());
         QVERIFY(mParser.getFilsByOrderInFolder(folder()).empty());
-        QVERIFY(timer.elapsed() < 2000);
+        QVERIFY(timer.elapsed() < PATIENCE_MS);
         QCOMPARE(read("t.xml"), bytes);
     }
 

@@ -4,6 +4,7 @@ Every test gets a fresh data path, log folder, display and pair of processes. Wh
 logs and the picture differences stay under tests/e2e/ in the build tree.
 """
 import atexit
+import contextlib
 import fcntl
 import json
 import os
@@ -13,6 +14,7 @@ import socket
 import subprocess
 import sys
 import tempfile
+import threading
 import time
 import unittest
 import xml.etree.ElementTree
@@ -108,9 +110,36 @@ class Title:
         return self.stem + suffix
 
 
+class Ending(threading.Thread):
+    """Ends the programs of a test that has passed while the next one begins: the end of a titler takes seconds. Leaks are
+    only looked for at an orderly end, so what the programs leave is judged here."""
+
+    def __init__(self, test):
+        super().__init__()
+        self.test = test
+        self.problem = None
+        self.start()
+
+    def run(self):
+        try:
+            with self.test.at_end:
+                self.problem = self.test.end_and_judge()
+        except Exception as error:  # pylint: disable=broad-exception-caught
+            self.problem = repr(error)
+        if self.problem is None:
+            shutil.rmtree(self.test.keep, ignore_errors=True)
+
+    def verify(self):
+        """Waits until the programs have ended."""
+        self.join()
+        if self.problem is not None:
+            raise AssertionError(f"{self.test.id()}: {self.problem}, see {self.test.keep}")
+
+
 class TitlerTest(unittest.TestCase):
     """A test case with a running appliance and titler."""
 
+    ending = None
     samples = None
     # Characters to be typed that an ordinary keyboard has not.
     extra_keys = ""
@@ -118,7 +147,28 @@ class TitlerTest(unittest.TestCase):
     display_class = session.Display
     environment_changes = {}
 
+    def __init__(self, *arguments):
+        super().__init__(*arguments)
+        self.at_end = contextlib.ExitStack()
+
+    @classmethod
+    def setUpClass(cls):
+        super().setUpClass()
+        cls.addClassCleanup(cls.wait_for_ending)
+
+    @classmethod
+    def wait_for_ending(cls):
+        """Waits until the programs of the test before have ended, and fails if they did not end well."""
+        ending, TitlerTest.ending = TitlerTest.ending, None
+        if ending:
+            ending.verify()
+
+    def addCleanup(self, function, /, *arguments, **options):
+        """As unittest's, but called after the programs have ended."""
+        self.at_end.callback(function, *arguments, **options)
+
     def setUp(self):
+        super().addCleanup(self.clean_up)
         self.keep = os.path.join(BUILD, "tests", "e2e", self.id().split(".", 1)[-1])
         shutil.rmtree(self.keep, ignore_errors=True)
         os.makedirs(self.keep)
@@ -198,16 +248,24 @@ class TitlerTest(unittest.TestCase):
         passed = not failed and sys.exc_info()[0] is None and self._outcome.success
         if not passed and self.display:
             self.display.screenshot(os.path.join(self.keep, "failed.png"))
-        ends = self.end_programs()
-        reports = self.sanitizer_reports()
-        self.assertEqual(reports, "")
-        if passed:
-            self.assertEqual(set(ends) - {0}, set(), f"exit codes {ends}, see {self.keep}")
-            shutil.rmtree(self.keep, ignore_errors=True)
+        before, TitlerTest.ending = TitlerTest.ending, Ending(self) if passed else None
+        problem = None if passed else self.end_and_judge()
+        if before:
+            before.verify()
+        self.assertIsNone(problem)
 
-    def end_programs(self):
-        """Ends what runs, the titler first, and gives the exit codes: leaks are only looked for at an orderly end."""
-        return [program.stop(30 * SLOW) for program in reversed(self.programs) if not program.killed]
+    def clean_up(self):
+        """Called after each test; a test that has passed is cleaned up by its ending."""
+        if TitlerTest.ending is None or TitlerTest.ending.test is not self:
+            self.at_end.close()
+
+    def end_and_judge(self):
+        """Ends what runs, the titler first. Returns what was wrong with the end, or None."""
+        ends = [program.stop(30 * SLOW) for program in reversed(self.programs) if not program.killed]
+        reports = self.sanitizer_reports()
+        if reports:
+            return reports
+        return f"exit codes {ends}" if set(ends) - {0} else None
 
     def sanitizer_reports(self):
         """What the sanitizers had to say about the programs of this test."""

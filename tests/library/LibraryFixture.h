@@ -6,6 +6,7 @@
 #include "document/ArchiveOrder.h"
 #include "document/TText.h"
 #include "document/TextStyle.h"
+#include "support/FileSyncQueue.h"
 #include "tests/fakes/FakeEditContext.h"
 #include "tests/fakes/FakeMessageBoxController.h"
 #include "tests/fakes/FakeTitleChangeReporter.h"
@@ -18,6 +19,7 @@
 #include <QPair>
 #include <QStringList>
 #include <QTemporaryDir>
+#include <chrono>
 #include <memory>
 #include <string>
 #include <vector>
@@ -60,6 +62,7 @@ public:
     QString makeFolder(const QString& name)
     {
         const QString path = titleRoot() + QLatin1Char('/') + name;
+        FileSyncQueue::flush(std::chrono::seconds(30)); // keeps versions in the folders until then
         QDir(path).removeRecursively();
         QDir().mkpath(path);
         return path;

@@ -346,7 +346,7 @@ void tst_thumbnailrender::waitingWithoutEventsDrawsWhatIsLeft()
     render.makeThumbnail(archive.get(), true);
     QElapsedTimer time;
     time.start();
-    while (!render.makePictureThreadIsFinished() && time.elapsed() < 20000)
+    while (!render.makePictureThreadIsFinished() && time.elapsed() < PATIENCE_MS)
         QThread::msleep(1); // as the window does when it closes: no events come in
     QCOMPARE(QImage(folder + QStringLiteral("/t_1920.png")).pixelColor(5, 5), QColor(20, 90, 40));
 }

@@ -11,8 +11,10 @@
 #include "library/ArchiveList.h"
 #include "library/FolderPicker.h"
 #include "library/TemplatePicker.h"
+#include "support/FileSyncQueue.h"
 #include "tests/app/Siblings.h"
 #include "tests/library/LibraryFixture.h"
+#include "tests/support/Patience.h"
 #include "touchui/KSInputContext.h"
 #include "touchui/KSPushbutton.h"
 #include "touchui/KSTreeModel.h"
@@ -25,6 +27,7 @@
 #include <QTest>
 #include <QTextCursor>
 #include <QTimer>
+#include <chrono>
 #include <functional>
 
 class tst_windowdialogs_folder : public QObject
@@ -119,7 +122,9 @@ void tst_windowdialogs_folder::cleanupTestCase()
 
 void tst_windowdialogs_folder::init()
 {
-    QDir(mFiles.titleRoot()).removeRecursively();
+    QVERIFY(FileSyncQueue::flush(
+        std::chrono::milliseconds(PATIENCE_MS))); // keeps versions in the folders until then
+    QVERIFY(QDir(mFiles.titleRoot()).removeRecursively());
     LibraryFixture::fillFolder(mFiles.makeFolder("news"), {"t1", "t2"});
     LibraryFixture::fillFolder(mFiles.makeFolder("sports"), {"t3"});
 }

@@ -1,4 +1,5 @@
 // The check in front of TinyXML, and loading and saving through it.
+#include "Patience.h"
 #include "support/AtomicFile.h"
 #include "support/XmlFile.h"
 #include "support/XmlFileGuard.h"
@@ -125,7 +126,7 @@ private Q_SLOTS:
         const QString path = write(bytes);
         TiXmlDocument document;
         QCOMPARE(XmlFile::load(path.toStdString(), document), isAccepted);
-        QVERIFY(timer.elapsed() < 5000);
+        QVERIFY(timer.elapsed() < PATIENCE_MS);
     }
 
     // Whatever is made of a good file, what the check lets through is shallow, and what it refuses TinyXML
@@ -223,7 +224,7 @@ private Q_SLOTS:
             if (isLoaded)
                 QVERIFY(tinyXmlAccepts(cut));
         }
-        QVERIFY(timer.elapsed() < 10000);
+        QVERIFY(timer.elapsed() < PATIENCE_MS);
     }
 
     void loadsAsTinyXmlLoads_data()
