@@ -1,5 +1,4 @@
 // The title file and the order file of a folder.
-#include "../support/Patience.h"
 #include "document/Archive.h"
 #include "document/ArchiveOrder.h"
 #include "document/FolderTitles.h"
@@ -7,6 +6,7 @@
 #include "document/TitleParser.h"
 #include "document/TitleParserUtility.h"
 #include "support/FileSyncQueue.h"
+#include "tests/support/Patience.h"
 
 #include <QDir>
 #include <QElapsedTimer>
