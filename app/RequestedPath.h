@@ -2,8 +2,9 @@
 
 #include <QString>
 
-// Tells what the path of an edit request leads to. Only folders of titles and the titles in them can be
-// opened: files elsewhere must not be changed or cleaned up. Looks at the disk when it is made. GUI thread.
+// Finds out what the path of an edit request leads to. Only folders of titles and the titles in them can be
+// opened: files elsewhere must not be changed or cleaned up. The constructor reads the disk; what changes
+// there later is not noticed. GUI thread.
 class RequestedPath
 {
 public:
@@ -18,11 +19,10 @@ public:
     explicit RequestedPath(const QString& path);
 
     Target target() const { return m_target; }
-    // Returns whether there is something for which the window is to be shown.
+    // Returns whether the window is to be shown for this path.
     bool canBeOpened() const { return m_target != Target::Missing && m_target != Target::Outside; }
 
-    const QString& path() const { return m_path; }
-    // The two parts of the path of a title.
+    // Return the two parts of the path of a title.
     QString folder() const;
     QString fileName() const;
 

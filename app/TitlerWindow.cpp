@@ -322,7 +322,8 @@ void TitlerWindow::showTitlerWindow(titler_paramter paramter)
         return;
     mUnsavedWork.takeQuestion();
     const RequestedPath path(QString::fromStdWString(paramter.path));
-    // A window manager may lose the next request's window to the late end of one that only flashed up.
+    // A window that is hidden right after it was shown confuses window managers: they may handle the end of
+    // it so late that they unmap the window of the next request.
     if (paramter.mode != _titler_paramter::CREATE_OR_EDIT || path.canBeOpened()) {
         show();
         activateWindow();
