@@ -310,11 +310,6 @@ double GraphicsText::canvasRatio() const
     return m_painter->ratio();
 }
 
-CaretGeometry& GraphicsText::carets()
-{
-    return m_painter->carets();
-}
-
 quint64 GraphicsText::contentVersion() const
 {
     return m_painter->contentVersion();

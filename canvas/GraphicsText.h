@@ -10,9 +10,9 @@
 #include <QGraphicsTextItem>
 #include <QPointF>
 #include <QRectF>
+#include <QTextCursor>
 #include <memory>
 
-class CaretGeometry;
 class QGraphicsDropShadowEffect;
 class QKeyEvent;
 class StyleDocument;
@@ -122,8 +122,6 @@ public:
     // Repaints the frame together with the item.
     void update(const QRectF& rect = QRectF());
 
-    // Returns the positions of the carets, in item coordinates.
-    CaretGeometry& carets();
     // Returns a number that changes whenever what is drawn may have changed.
     quint64 contentVersion() const;
     double canvasRatio() const override;

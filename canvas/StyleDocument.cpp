@@ -69,12 +69,6 @@ TextStyle* StyleDocument::at(int position) const
     return position >= 0 && position < int(items.size()) ? items[size_t(position)] : nullptr;
 }
 
-bool StyleDocument::isLineBreak(int position) const
-{
-    const TextStyle* style = at(position);
-    return style && style->getText().size() == 1 && style->getText()[0] == CHARENTER;
-}
-
 QString StyleDocument::textOf(const TextStyle& style)
 {
     return QString::fromStdString(style.getText());

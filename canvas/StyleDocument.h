@@ -33,7 +33,6 @@ public:
     bool isEmpty() const { return m_current.textItems().empty(); }
     // Returns the style, which the record owns, or null out of range.
     TextStyle* at(int position) const;
-    bool isLineBreak(int position) const;
     // Returns the character as it was typed; for the second half of a pair a low surrogate.
     QChar characterAt(int position) const;
 
@@ -63,7 +62,6 @@ public:
 
     // Keeps the state from before the first preview until it is taken back or another record is set.
     void markPreviewStart();
-    bool isPreviewing() const { return m_previewing; }
     // Restores every style from before the preview. Returns whether there was a preview.
     bool takeBackPreview();
     // Restores the styles from before the preview in a copy of the current record.

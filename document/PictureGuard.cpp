@@ -392,8 +392,3 @@ PictureGuard::PictureGuard(const QByteArray& bytes)
     mFormat = format->name;
     mSize = *size;
 }
-
-bool PictureGuard::isKnown(const QByteArray& bytes)
-{
-    return formatOf({bytes.constData(), static_cast<std::size_t>(bytes.size())}) != nullptr;
-}

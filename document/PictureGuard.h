@@ -25,9 +25,6 @@ public:
     // Returns the stored size in pixels; empty if refused.
     QSize size() const { return isAccepted() ? mSize : QSize(); }
 
-    // Returns whether bytes begin with the signature of one of the five formats.
-    static bool isKnown(const QByteArray& bytes);
-
 private:
     QByteArray mFormat;
     QSize mSize;

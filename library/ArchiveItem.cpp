@@ -277,14 +277,6 @@ void ArchiveItem::setLabelText(const QString& text, QLabel* label)
     placeLine(label);
 }
 
-QStringList ArchiveItem::textLines() const
-{
-    QStringList lines;
-    for (const QLabel* label : mLabels)
-        lines.append(label->text());
-    return lines;
-}
-
 ArchiveItem* ArchiveItem::clone()
 {
     auto archive = mArchive ? std::make_unique<Archive>(*mArchive) : std::make_unique<Archive>();

@@ -71,9 +71,6 @@ public:
     void updateLeftChild(QImage image);
     void updateRightChild();
 
-    // Returns the text lines shown.
-    QStringList textLines() const;
-
     // Shows or hides the handle; the text lines are shortened to make room for it.
     void setDragFlag(bool dragFlag) override;
 

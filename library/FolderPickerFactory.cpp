@@ -53,14 +53,8 @@ QWidget* FolderPickerFactory::createControl(QWidget* parent, _controlType, const
     if (getColumnDataType(index.column()) != NameDataType || !index.data(KSVIEW::ItemIsForderRole).toBool())
         return nullptr;
     auto* editor = new FolderEditor(parent);
-    mEditor = editor;
     Q_EMIT signalCreateEditor(editor);
     return editor;
-}
-
-void FolderPickerFactory::slotReleaseEditor()
-{
-    mEditor = nullptr;
 }
 
 void FolderPickerFactory::importSourceData()

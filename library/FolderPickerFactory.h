@@ -8,7 +8,6 @@
 #include <QHash>
 #include <QList>
 #include <QMap>
-#include <QPointer>
 #include <QString>
 #include <QStringList>
 
@@ -34,7 +33,6 @@ public:
 
     // Sets the root, without a slash at its end; call importSourceData() to read it.
     void setRootPath(const QString& path) { mRootPath = path; }
-    QString rootPath() const { return mRootPath; }
     // Sets the font of the rows that are made from now on.
     void setItemFont(const QFont& font) { mFont = font; }
 
@@ -66,7 +64,8 @@ Q_SIGNALS:
     void signalCreateEditor(FolderEditor* editor);
 
 public Q_SLOTS:
-    void slotReleaseEditor();
+    // Called when the editor was released, which the view deletes.
+    void slotReleaseEditor() {}
 
 private:
     void getChildInfo(const QString& path, int folder);
@@ -94,5 +93,4 @@ private:
     QMap<int, QList<QFileInfo>> mTitleInfos; // of the folders whose titles were read
     QMap<int, QStringList> mTitleNames;
     QMap<int, bool> mHasTitles; // results of hasTitles()
-    QPointer<FolderEditor> mEditor;
 };

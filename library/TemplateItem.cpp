@@ -24,13 +24,11 @@ void TemplateItem::setImage(QString path)
 
 void TemplateItem::setNormalStyle()
 {
-    mHasSelectedStyle = false;
     setStyleSheet(QStringLiteral("QPushButton {border:0; background:url(:/checker) no-repeat center;}"));
 }
 
 void TemplateItem::setSelectedStyle()
 {
-    mHasSelectedStyle = true;
     setStyleSheet(QStringLiteral("QPushButton { border: 4px solid rgb(0, 129, 255); "
                                  "background:url(:/checker) no-repeat center;};"));
 }

@@ -28,7 +28,6 @@ public:
     void setImage(QString path);
     void setNormalStyle();
     void setSelectedStyle();
-    bool hasSelectedStyle() const { return mHasSelectedStyle; }
 
     // Called on a tap: shows the selected style and emits itemSelected().
     void clickTriggered();
@@ -44,7 +43,6 @@ protected:
 private:
     int mIndex;
     bool mIsUser;
-    bool mHasSelectedStyle = false;
     QString mImagePath;
     bool mIsLoaded = false;
     UserTemplateMenu* mMenu = nullptr; // a child of this item

@@ -142,7 +142,6 @@ void ThumbnailRender::createMiddleSizeCanvasSceneUsingArchiveData(const Archive&
         text->initShowText();
         if (auto* shadow = qobject_cast<QGraphicsDropShadowEffect*>(text->graphicsEffect()))
             shadow->setColor(DROP_SHADOW_COLOR);
-        mTexts.append(text);
         mMiddleScene.addItem(text);
         logBoundingRect(*text, record->getTextObjectID());
     }
@@ -163,7 +162,6 @@ void ThumbnailRender::saveMiddleSizeThumnail(const Archive& archive, const QImag
 
 void ThumbnailRender::clearMiddleSizeCanvasScene()
 {
-    mTexts.clear();
     mMiddleScene.clear();
     mMiddleBackground = nullptr;
     clearMiddleSizeCanvasSceneResource();

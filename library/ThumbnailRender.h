@@ -79,7 +79,6 @@ private:
     };
 
     std::deque<std::unique_ptr<BigPicture>> mBigPictures;
-    QList<GraphicsText*> mTexts; // of the last fast layout; owned by mMiddleScene
     QGraphicsScene mMiddleScene;
     QGraphicsScene mBigScene;
     GraphicsPixmap* mMiddleBackground = nullptr; // owned by mMiddleScene

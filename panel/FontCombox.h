@@ -25,7 +25,6 @@ public:
     // whole folder. With fromSettings the path of the folder is read from the settings, otherwise the path
     // from the last call is used. Files that are not fonts are skipped.
     void addImportFontsToApplication(bool fromSettings, bool all, const QString& file);
-    QStringList importedFamilies() const { return m_imported; }
 
     // Shows the family; an unknown or empty one shows none.
     void setFontFamily(const QString& family);

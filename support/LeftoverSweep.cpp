@@ -97,11 +97,6 @@ std::vector<std::string> namesIn(const std::string& folder)
 
 } // namespace
 
-bool LeftoverSweep::isWhole(const std::string& path)
-{
-    return isWholeAs(path, path);
-}
-
 void LeftoverSweep::sweep(const std::string& folder)
 {
     const std::string base = std::filesystem::path(folder + '/').lexically_normal().parent_path().native();

@@ -18,8 +18,4 @@ public:
     // Sweeps the program's folders: settings, user templates and presets. The list of titles sweeps the
     // folders of titles when it is first opened.
     static void sweepProgramFolders();
-
-    // Returns whether a file is complete: an XML or PNG file, by its extension, if it can be read to its end,
-    // any other file if it is not empty.
-    static bool isWhole(const std::string& path);
 };

@@ -160,11 +160,6 @@ void KSCombobox::setDisabled(bool disabled)
     QComboBox::setDisabled(disabled);
 }
 
-bool KSCombobox::isPopupVisible() const
-{
-    return m_popup->isVisible();
-}
-
 void KSCombobox::showPopup()
 {
     if (m_popup->isVisible()) {

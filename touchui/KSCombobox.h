@@ -28,7 +28,6 @@ public:
 
     void showPopup() override;
     void hidePopup() override;
-    bool isPopupVisible() const;
     CustomComboBoxView* listView() const { return m_view; }
 
     // If false, the list does not open.

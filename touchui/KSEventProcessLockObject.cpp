@@ -67,12 +67,10 @@ int KSEventProcessLockObject::notify(QObject*, KSLockObject*, LOCK_MESSAGE messa
 {
     switch (message) {
     case LOCK_MSG_LOCKED:
-        m_locallyLocked = true;
         send(APPEventDefine::LOCKTYPE_TOUCH, true);
         break;
     case LOCK_MSG_UNLOCKED:
     case LOCK_MSG_RESET:
-        m_locallyLocked = false;
         send(APPEventDefine::LOCKTYPE_TOUCH, false);
         break;
     case LOCK_MSG_CLEARED:

@@ -31,9 +31,6 @@ public:
     void reset() override {}
     QList<QObject*> registeredObj() override { return {}; }
 
-    // Returns whether an object of this process holds a touch that was announced.
-    bool isLocallyLocked() const { return m_locallyLocked; }
-
     // Type of the event that is sent to the remembered object when another process asks this one to close its
     // transient controls.
     static constexpr int RestoreOriginalType = 1001;
@@ -53,7 +50,6 @@ private:
     void send(APPEventDefine::LOCKTYPE type, bool on);
 
     KSAppEventFilter* m_filter;
-    bool m_locallyLocked = false;
     bool m_remoteObjectLocked = false;
     bool m_remoteLocked = false;
     QPointer<QObject> m_object;

@@ -34,7 +34,6 @@ public:
 
     // Sets the time in milliseconds after which the menu closes; 0 for never.
     void setAutoCloseTime(int milliseconds);
-    int autoCloseTime() const { return m_autoCloseTime; }
     // These have an effect only if a time is set.
     void startAutoCloseTimer();
     void restartAutoCloseTimer();

@@ -9,6 +9,7 @@ namespace
 {
 
 constexpr int SLICES_PER_STATE = 3;
+constexpr int TEXT_MARGIN = 8; // from the left and right edge, in pixels
 const QColor TEXT(220, 220, 220);
 const QColor DISABLED_TEXT(102, 102, 102);
 
@@ -106,12 +107,6 @@ void KSPushbutton::setTextAlignment(Qt::Alignment alignment)
     update();
 }
 
-void KSPushbutton::setTextMargin(int margin)
-{
-    m_textMargin = margin;
-    update();
-}
-
 // Disabling and enabling keep the button selected or unselected and select the matching state.
 void KSPushbutton::changeEvent(QEvent* event)
 {
@@ -196,6 +191,6 @@ void KSPushbutton::drawText(QPainter& painter)
     const QColor ink = chosen ? palette().color(QPalette::Active, QPalette::ButtonText) : TEXT;
     painter.setPen(disabled ? DISABLED_TEXT : ink);
     painter.setFont(font());
-    const QRect area = rect().adjusted(m_textMargin, 0, -m_textMargin, 0);
+    const QRect area = rect().adjusted(TEXT_MARGIN, 0, -TEXT_MARGIN, 0);
     painter.drawText(area, static_cast<int>(m_textAlignment) | Qt::TextSingleLine, text());
 }

@@ -63,10 +63,6 @@ public:
     void cleanImages();
 
     void setTextAlignment(Qt::Alignment alignment);
-    Qt::Alignment textAlignment() const { return m_textAlignment; }
-    // Sets the distance of the text from the left and right edge in pixels.
-    void setTextMargin(int margin);
-    int textMargin() const { return m_textMargin; }
     void setButtonId(int id) { m_buttonId = id; }
     int buttonId() const { return m_buttonId; }
 
@@ -95,5 +91,4 @@ private:
     QPixmap m_backgroundImage;
     Qt::Alignment m_textAlignment = Qt::AlignCenter;
     int m_buttonId = -1;
-    int m_textMargin = 8;
 };

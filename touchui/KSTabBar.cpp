@@ -41,12 +41,6 @@ KSTabBar::KSTabBar(QWidget* parent) : QTabBar(parent), m_style(new KSTabStyle)
     setPalette(colors);
 }
 
-void KSTabBar::setImages(const QString& images)
-{
-    m_style->setImages(images);
-    update();
-}
-
 bool KSTabBar::isUpright() const
 {
     switch (shape()) {

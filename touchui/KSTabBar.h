@@ -25,8 +25,6 @@ public:
     QSize sizeHint() const override;
     QSize minimumSizeHint() const override { return sizeHint(); }
 
-    // Sets the pictures, see KSTabStyle.
-    void setImages(const QString& images);
     // Returns the tab under the finger, or -1.
     int pressedTab() const { return m_pressedTab; }
 

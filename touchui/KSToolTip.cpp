@@ -79,11 +79,6 @@ void KSToolTip::hideText()
     s_LongText.clear();
 }
 
-bool KSToolTip::isVisible()
-{
-    return s_KsToolTip != nullptr && s_KsToolTip->m_window != nullptr && s_KsToolTip->m_window->isVisible();
-}
-
 QFont KSToolTip::textFont()
 {
     QFont font = QApplication::font();

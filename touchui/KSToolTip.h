@@ -31,7 +31,6 @@ public:
     // Shows the text below a row. Hides the balloon if the text fits into shownWidth pixels.
     static void showTextForTreeView(const QRect& row, const QString& text, int shownWidth = 0);
     static void hideText();
-    static bool isVisible();
     // Returns the full text, even if it is shown elided.
     static QString text() { return s_LongText; }
     static QFont textFont();

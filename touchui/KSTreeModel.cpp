@@ -3,7 +3,6 @@
 #include "touchui/KSModelAttributeItem.h"
 #include "touchui/KSModelDataItem.h"
 #include "touchui/KSModelTreeDataItem.h"
-#include "touchui/KSTreeModelDefaultSortHelper.h"
 #include "touchui/KSVIEW.h"
 
 #include <QColor>
@@ -35,10 +34,7 @@ bool isForderItem(KSModelItem* item)
 } // namespace
 
 KSTreeModel::KSTreeModel(KSModelDataFactory* factory, int columnCount, QObject* parent)
-    : QAbstractItemModel(parent)
-    , m_factory(factory)
-    , m_sortHelper(std::make_unique<KSTreeModelDefaultSortHelper>())
-    , m_columnCount(std::max(0, columnCount))
+    : QAbstractItemModel(parent), m_factory(factory), m_columnCount(std::max(0, columnCount))
 {
     installDefaultAttributes();
     createRoot();
@@ -275,13 +271,6 @@ void KSTreeModel::setAttributeOfAll(int role, const QVariant& value)
     }
 }
 
-void KSTreeModel::setSortHelper(std::unique_ptr<KSTreeModelSortHelper> helper)
-{
-    if (helper != nullptr) {
-        m_sortHelper = std::move(helper);
-    }
-}
-
 QModelIndex KSTreeModel::index(int row, int column, const QModelIndex& parent) const
 {
     if (column < 0 || column >= m_columnCount || row < 0 || row >= rowCount(parent)) {
@@ -487,7 +476,7 @@ void KSTreeModel::useSortHelper(int column, Qt::SortOrder order, QList<KSModelIt
 {
     if (m_factory != nullptr) {
         const int dataType = m_factory->getColumnDataType(column);
-        m_sortHelper->sortChildList(dataType, sortKindOf(dataType), list, order);
+        m_sortHelper.sortChildList(dataType, sortKindOf(dataType), list, order);
     }
 }
 

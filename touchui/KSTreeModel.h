@@ -2,7 +2,7 @@
 
 #include "touchui/KSModelDataFactory.h"
 #include "touchui/KSModelItem.h"
-#include "touchui/KSTreeModelSortHelper.h"
+#include "touchui/KSTreeModelDefaultSortHelper.h"
 
 #include <QAbstractItemModel>
 #include <QMap>
@@ -24,7 +24,6 @@ public:
     ~KSTreeModel() override;
 
     KSModelDataFactory* factory() const { return m_factory; }
-    KSModelItem::KSModelItemType itemType() const { return m_itemType; }
 
     // Removes all items, reads the source and creates the top rows.
     void createDataItems();
@@ -67,8 +66,6 @@ public:
     // Sets the role of every existing item that has a value for it.
     void setAttributeOfAll(int role, const QVariant& value);
 
-    // Takes ownership of the helper. The default is a KSTreeModelDefaultSortHelper.
-    void setSortHelper(std::unique_ptr<KSTreeModelSortHelper> helper);
     // Moves files, or folders, to the front; the order within each group is kept.
     static void rankFileAndForder(QList<KSModelItem*>& list, bool filesFirst);
 
@@ -111,10 +108,9 @@ private:
     void changeColumns(int column, int removed, int inserted);
 
     KSModelDataFactory* m_factory;
-    std::unique_ptr<KSTreeModelSortHelper> m_sortHelper;
+    KSTreeModelDefaultSortHelper m_sortHelper;
     std::unique_ptr<KSModelItem> m_root;
     KSModelItem* m_currentRoot = nullptr;
-    KSModelItem::KSModelItemType m_itemType = KSModelItem::TreeDataItem;
     int m_columnCount;
     QMap<int, QMap<int, QVariant>> m_defaultAttributes; // keys: role, column
     QMap<int, QVariant> m_headerAttributes;             // key: role

@@ -26,7 +26,6 @@ public:
     // lift even after stop().
     void start();
     void stop();
-    bool isWatching() const { return m_watching; }
 
     bool eventFilter(QObject* obj, QEvent* event) override;
 

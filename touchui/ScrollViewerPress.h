@@ -43,7 +43,6 @@ public:
     bool willFlick = false;
     bool outOfBounds = false;
     bool dragAreaPressed = false;
-    bool popupRequested = false;
     TouchTimer hold;
     TouchTimer popup;
 };

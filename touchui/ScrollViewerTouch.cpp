@@ -73,7 +73,6 @@ void ScrollViewerTouch::rest()
     m_press.drop();
     m_press.moved = false;
     m_press.willFlick = false;
-    m_press.popupRequested = false;
     if (m_drag.isActive()) {
         m_drag.returnToOrigin();
         dropItem();
@@ -322,7 +321,6 @@ void ScrollViewerTouch::endPress(const QPoint& pos)
     if (m_drag.isActive() || moved) {
         dropAtRelease();
         m_press.moved = false;
-        m_press.popupRequested = false;
         m_press.willFlick = false;
     } else if (m_press.item && isInsidePressedItem(pos)) {
         Q_EMIT clicked(m_press.item, m_press.positionInItem);
@@ -399,7 +397,6 @@ void ScrollViewerTouch::startDrag(KSBaseItemWidget* item)
         return;
     m_press.item = item;
     m_press.index = m_board.indexOf(item);
-    m_press.popupRequested = true;
     m_press.willFlick = false;
     m_drag.setSize(item->size());
     item->setPopup(true);

@@ -3,8 +3,6 @@
 #include <QBitmap>
 #include <QPainter>
 
-#include <algorithm>
-
 SliceFrame::SliceFrame(const QStringList& paths)
 {
     if (paths.size() != NineSlice::PieceCount) {
@@ -65,10 +63,4 @@ QMargins SliceFrame::corners() const
 {
     return QMargins(m_pieces[NineSlice::UpperLeft].width(), m_pieces[NineSlice::UpperLeft].height(),
                     m_pieces[NineSlice::UpperRight].width(), m_pieces[NineSlice::BottomLeft].height());
-}
-
-bool SliceFrame::isNull() const
-{
-    return std::all_of(m_pieces.begin(), m_pieces.end(),
-                       [](const QPixmap& picture) { return picture.isNull(); });
 }

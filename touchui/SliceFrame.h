@@ -33,7 +33,6 @@ public:
 
     const QPixmap& piece(NineSlice::Piece piece) const { return m_pieces[piece]; }
     QMargins corners() const;
-    bool isNull() const;
 
 private:
     std::array<QPixmap, NineSlice::PieceCount> m_pieces;

@@ -63,7 +63,6 @@ bool TouchEventButton::touchBeginEvent(QTouchEvent* event)
     if (m_finger.follow(event, this) != OneFinger::Step::Begin) {
         return true;
     }
-    ++m_pressCount;
     m_lastPosition = m_finger.positionIn(this).toPoint();
     QMouseEvent press(QEvent::MouseButtonPress, m_lastPosition, m_finger.position().toPoint(), Qt::LeftButton,
                       Qt::LeftButton, Qt::NoModifier);
@@ -110,11 +109,6 @@ void TouchEventButton::comeUp()
                      Qt::NoModifier);
     mouseMoveEvent(&move);
     sendRelease(outside, mapToGlobal(outside));
-}
-
-void TouchEventButton::breakTouch()
-{
-    OneFinger::cancelTouchOf(this);
 }
 
 void TouchEventButton::sendRelease(const QPoint& position, const QPoint& screenPosition)

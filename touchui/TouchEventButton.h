@@ -26,11 +26,7 @@ public:
 
     // A finger inside this rectangle counts as being on the button, even beside it. Null for none.
     void setTouchRect(const QRect& rect) { m_touchRect = rect; }
-    QRect touchRect() const { return m_touchRect; }
 
-    // Ends the current touch without a click and releases its touch lock. Call for a button that is removed
-    // under the finger and will not receive the lift.
-    void breakTouch();
     // Returns true while the button is released because its touch was cancelled, not by the operator.
     bool isTouchCancelled() const { return m_touchCancelled; }
 
@@ -55,7 +51,6 @@ private:
     void sendRelease(const QPoint& position, const QPoint& screenPosition);
 
     OneFinger m_finger{this};
-    int m_pressCount = 0;
     QPoint m_lastPosition;
     QRect m_touchRect;
     bool m_touchCancelled = false;

@@ -31,7 +31,6 @@ public:
     ~TouchTimer() override;
 
     void setSingleShot(bool singleShot) { m_singleShot = singleShot; }
-    bool isSingleShot() const { return m_singleShot; }
     // Restarts the timer if it is running.
     void start(int milliseconds);
     void stop();

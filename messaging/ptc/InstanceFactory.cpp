@@ -57,9 +57,4 @@ void InstanceFactory::setRemoteReceiver(IRemoteReceiver* receiver)
     m_remoteReceiver.reset(receiver);
 }
 
-IRemoteReceiver* InstanceFactory::remoteReceiver()
-{
-    return m_remoteReceiver.get();
-}
-
 } // namespace PTC

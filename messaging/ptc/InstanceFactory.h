@@ -35,7 +35,6 @@ protected:
     void addSender(ISender* sender);
     // Takes ownership of the receiver and deletes the previous one. Null is allowed.
     void setRemoteReceiver(IRemoteReceiver* receiver);
-    IRemoteReceiver* remoteReceiver();
 
 private:
     std::unique_ptr<IRemoteReceiver> m_remoteReceiver;

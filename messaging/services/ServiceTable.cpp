@@ -98,17 +98,6 @@ const Service* findByInterface(long interfaceId)
     return found != SERVICES.end() ? &*found : nullptr;
 }
 
-const Service* findByAdapter(long adapterType)
-{
-    if (adapterType == NO_ADAPTER) {
-        return nullptr;
-    }
-    const auto found = std::ranges::find_if(SERVICES, [adapterType](const Service& service) {
-        return service.callBackAdapter == adapterType || service.notifyAdapter == adapterType;
-    });
-    return found != SERVICES.end() ? &*found : nullptr;
-}
-
 long senderKeyOf(long client)
 {
     return isClient(client) ? SENDER_KEYS[static_cast<std::size_t>(client - MAIN_CLIENT)] : TITLER_CLIENT_KEY;

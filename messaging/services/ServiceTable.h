@@ -32,8 +32,6 @@ struct Service {
 std::span<const Service> services();
 // Returns null for an id that is not in the table.
 const Service* findByInterface(long interfaceId);
-// Returns the service that has this callback or notify adapter type, or null for an unknown type.
-const Service* findByAdapter(long adapterType);
 // Returns the key of the sender to the process with that client number; the key of this process for an
 // unknown number.
 long senderKeyOf(long client);

@@ -94,7 +94,7 @@ public:
         QLineF line;
         QPointF point;
         int block = 0;
-        item.carets().caretPoint(line, point, block, position);
+        CaretGeometry(*item.document()).caretPoint(line, point, block, position);
         return inView(item, line.center());
     }
     // Returns the middle of the character at a position.
@@ -108,7 +108,7 @@ public:
         QLineF line;
         QPointF point;
         int block = 0;
-        item.carets().caretPoint(line, point, block, position);
+        CaretGeometry(*item.document()).caretPoint(line, point, block, position);
         return point;
     }
     QPoint handleIn(GraphicsText& item, int position) const

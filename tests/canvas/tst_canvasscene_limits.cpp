@@ -269,7 +269,7 @@ void tst_canvasscene_limits::sizes()
     QLineF line;
     QPointF point;
     int block = 0;
-    QVERIFY(item->carets().caretPoint(line, point, block, 1));
+    QVERIFY(CaretGeometry(*item->document()).caretPoint(line, point, block, 1));
     // A line is about as high as its characters at two thirds of their size.
     QVERIFY(line.length() > size * 0.6 && line.length() < size * 1.2);
     // The shadow scales with the size.

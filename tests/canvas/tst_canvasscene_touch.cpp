@@ -265,12 +265,12 @@ void tst_canvasscene_touch::handleIsGrabbedBesideItsPicture()
     QLineF line;
     QPointF point;
     int block = 0;
-    QVERIFY(item->carets().caretPoint(line, point, block, 5));
+    QVERIFY(CaretGeometry(*item->document()).caretPoint(line, point, block, 5));
     const QPointF beside = point + QPointF(24.0 + 7.0, 10.0);
     const QPoint pressed = canvas.view.mapFromScene(item->mapToScene(beside));
     QTest::mousePress(canvas.view.viewport(), Qt::LeftButton, {}, pressed);
     // A press beside the handle starts at its other end; a drag selects from there.
-    QVERIFY(item->carets().caretPoint(line, point, block, 7));
+    QVERIFY(CaretGeometry(*item->document()).caretPoint(line, point, block, 7));
     const QPointF target = point + QPointF(12.0, 10.0);
     canvas.sendMove(canvas.view.mapFromScene(item->mapToScene(target)) + QPoint(0, 5));
     canvas.sendMove(canvas.view.mapFromScene(item->mapToScene(target)));

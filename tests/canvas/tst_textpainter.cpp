@@ -237,7 +237,7 @@ void tst_textpainter::paintedInAViewInsideAWindow()
 void tst_textpainter::caretPoints()
 {
     Pair pair(makeRecord("ab\ncd\n"));
-    CaretGeometry& carets = pair.child->carets();
+    CaretGeometry carets(*pair.child->document());
     QLineF line;
     QPointF point;
     int block = -7;

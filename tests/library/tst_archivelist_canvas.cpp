@@ -1,4 +1,5 @@
 // The list, the canvas and the pictures together, wired as the window wires them.
+#include "ItemLooks.h"
 #include "LibraryFixture.h"
 
 #include "canvas/CanvasScene.h"
@@ -111,7 +112,7 @@ void tst_archivelist_canvas::newTitleShowsItsPictureAtOnce()
     createTitle(QStringLiteral("速報 New"));
     QCOMPARE(mList->count(), 1);
     const ArchiveItem* item = mList->archiveItem(0);
-    QCOMPARE(item->textLines().front(), QStringLiteral("速報 New"));
+    QCOMPARE(textLines(item).front(), QStringLiteral("速報 New"));
     QCOMPARE(canvasTitle(), QString::fromStdString(item->getArchiveData()->getName()));
     QVERIFY(!QFile::exists(item->getArchiveData()->getFullPathOfThumbnailSmall()));
 }

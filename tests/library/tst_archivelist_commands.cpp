@@ -1,4 +1,5 @@
 // Create, paste, delete, move and focus through an undo stack: list, order file, request and reports.
+#include "ItemLooks.h"
 #include "LibraryFixture.h"
 #include "tests/support/Patience.h"
 #include "tests/support/SettledFolder.h"
@@ -215,7 +216,7 @@ void tst_archivelist_commands::deleteOfTheCopiedTitleKeepsTheCopy()
     QVERIFY(!QFile::exists(folder + QStringLiteral("/b_240.png")));
     choose(0, ArchiveAction::ACTION_PASTE);
     QCOMPARE(mList->count(), 3);
-    QCOMPARE(item(1)->textLines().front(), QStringLiteral("b"));
+    QCOMPARE(textLines(item(1)).front(), QStringLiteral("b"));
     QVERIFY(QFile::exists(folder + QLatin1Char('/') + stem(1) + QStringLiteral("_240.png")));
 }
 

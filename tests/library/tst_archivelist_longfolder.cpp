@@ -1,5 +1,6 @@
 // Folders of more titles than an operator can make: items come as they are looked at and go again, titles are
 // read by and by, and every operation does what it does in a short folder.
+#include "ItemLooks.h"
 #include "TitleListFixture.h"
 #include "tests/support/Patience.h"
 
@@ -167,7 +168,7 @@ void tst_archivelist_longfolder::itemsAreMadeAsTheyComeIntoView()
     QCOMPARE(items(), 14);
     QCOMPARE(shownStem(203), stem(203));
     QTRY_VERIFY(m->item(206)->hasChildWidgets());
-    QCOMPARE(m->item(203)->textLines().front(), stem(203));
+    QCOMPARE(textLines(m->item(203)).front(), stem(203));
     QCOMPARE(m->item(203)->grab().toImage().pixelColor(120, 70), QColor(Qt::red));
     m->tapTitle(3);
     QCOMPARE(m->takeCanvas(), Names{stem(203)});
@@ -202,7 +203,7 @@ void tst_archivelist_longfolder::givenBackItemShowsTheSameAgain()
     m->list->moveToWidgetItem(0);
     QTRY_VERIFY(m->item(3)->hasChildWidgets());
     QCOMPARE(m->item(3)->grab().toImage(), look);
-    QCOMPARE(m->item(3)->textLines().front(), stem(3));
+    QCOMPARE(textLines(m->item(3)).front(), stem(3));
 }
 
 void tst_archivelist_longfolder::selectedItemIsKept()
@@ -314,7 +315,7 @@ void tst_archivelist_longfolder::unreadableTitleInView()
     QCOMPARE(listed(), without({302}));
     QCOMPARE(m->list->firstVisibleItem(), 300);
     QTRY_VERIFY(m->item(302)->hasChildWidgets());
-    QCOMPARE(m->item(302)->textLines().front(), stem(303));
+    QCOMPARE(textLines(m->item(302)).front(), stem(303));
     for (const ArchiveItem* item : m->list->findChildren<ArchiveItem*>())
         QVERIFY(!item->getArchiveDataPath().isEmpty());
 }
@@ -408,7 +409,7 @@ void tst_archivelist_longfolder::savedTitleFarDown()
     picture.fill(Qt::green);
     m->list->refreshBaseItem(folder + '/' + stem(250) + ".xml", picture);
     m->list->moveToWidgetItem(250);
-    QCOMPARE(m->item(250)->textLines().front(), QStringLiteral("速報"));
+    QCOMPARE(textLines(m->item(250)).front(), QStringLiteral("速報"));
     QCOMPARE(m->item(250)->grab().toImage().pixelColor(120, 70), QColor(Qt::green));
 }
 
@@ -524,7 +525,7 @@ void tst_archivelist_longfolder::loadedByTheThread()
     list.moveToWidgetItem(3);
     QCOMPARE(QFileInfo(list.archiveItem(3)->getArchiveDataPath()).completeBaseName(), stem(3));
     QTRY_VERIFY(list.archiveItem(3)->hasChildWidgets());
-    QCOMPARE(list.archiveItem(3)->textLines().front(), stem(3));
+    QCOMPARE(textLines(list.archiveItem(3)).front(), stem(3));
 }
 
 QTEST_MAIN(tst_archivelist_longfolder)

@@ -1,5 +1,6 @@
 // What a finger does to the title list: select, scroll, brake, open the menu and choose in it, and carry
 // titles to other places.
+#include "ItemLooks.h"
 #include "TitleListFixture.h"
 
 #include "tests/touchui/TouchDevice.h"
@@ -288,7 +289,7 @@ void tst_archivelist_touch::copyPasteAndDelete()
     m->holdAndChoose(0, ArchiveAction::ACTION_PASTE);
     QCOMPARE(m->list->count(), 3);
     QCOMPARE(m->selected(), 1);
-    QCOMPARE(m->item(1)->textLines().front(), QStringLiteral("t01"));
+    QCOMPARE(textLines(m->item(1)).front(), QStringLiteral("t01"));
     QVERIFY(!QImage(m->item(1)->getArchiveData()->getFullPathOfThumbnailSmall()).isNull());
     QCOMPARE(LibraryFixture::order(folder), m->stems());
     m->stack.undo();
@@ -498,7 +499,7 @@ void tst_archivelist_touch::floatingTitleLooksLikeTheOne()
     const auto* floating = qobject_cast<ArchiveItem*>(m->list->getMoveItem());
     QVERIFY(floating && floating->isVisible());
     QCOMPARE(floating->size(), QSize(ArchiveItem::WIDGET_WIDTH, ArchiveItem::WIDGET_HEIGHT));
-    QCOMPARE(floating->textLines().front(), QStringLiteral("t01"));
+    QCOMPARE(textLines(floating).front(), QStringLiteral("t01"));
     QCOMPARE(floating->styleSheet(), ArchiveItem::OPERATE_AND_UN_SELECT_STATE);
     QVERIFY(floating->hasDragFlag());
     QCOMPARE(floating->x(), m->list->x() + 38 + 20); // aside from under the finger

@@ -1,4 +1,5 @@
 // The template picker under a finger, on folders.
+#include "ItemLooks.h"
 #include "TemplateFixture.h"
 #include "tests/support/Patience.h"
 #include "tests/touchui/TouchDevice.h"
@@ -107,7 +108,7 @@ private Q_SLOTS:
         tapItem(presets(), 0);
         mPicker->reloadTemplates(SystemSetupDef::emSystemLanguageEnglish);
         QCOMPARE(presets()->selectedItem(), presets()->item(1));
-        QVERIFY(presets()->item(1)->hasSelectedStyle());
+        QVERIFY(hasSelectedStyle(presets()->item(1)));
         QVERIFY(button("selectPresetButton")->isEnabled());
     }
 
@@ -187,8 +188,8 @@ private Q_SLOTS:
         QVERIFY(!button("selectUserButton")->isVisible());
         tapItem(presets(), 0);
         tapItem(presets(), 2);
-        QVERIFY(!presets()->item(0)->hasSelectedStyle());
-        QVERIFY(presets()->item(2)->hasSelectedStyle());
+        QVERIFY(!hasSelectedStyle(presets()->item(0)));
+        QVERIFY(hasSelectedStyle(presets()->item(2)));
         QVERIFY(button("selectPresetButton")->isEnabled());
 
         mPicker->setSelectedItem(false);
@@ -264,14 +265,14 @@ private Q_SLOTS:
         QCOMPARE(fileName()->text(), QString());
         tapItem(users(), 0);
         QCOMPARE(fileName()->text(), QString("first"));
-        QCOMPARE(preview()->textLines().first(), QString("one text"));
+        QCOMPARE(textLines(preview()).first(), QString("one text"));
         QVERIFY(button("deleteTemplateButton")->isEnabled());
         tapItem(users(), 1);
         QVERIFY(fileName()->text().startsWith("a name that"));
         QVERIFY(fileName()->text().endsWith(QChar(0x2026)));
         QVERIFY(QFontMetrics(fileName()->font()).horizontalAdvance(fileName()->text()) <=
                 fileName()->width());
-        QCOMPARE(preview()->textLines().mid(0, 3), QStringList({"Breaking", "快讯", "third"}));
+        QCOMPARE(textLines(preview()).mid(0, 3), QStringList({"Breaking", "快讯", "third"}));
 
         QSignalSpy selected(mPicker.get(), &TemplatePicker::selectedTemplate);
         tap(button("selectUserButton"));
@@ -287,7 +288,7 @@ private Q_SLOTS:
         openUserTab();
         QCOMPARE(users()->selectedItem(), users()->item(0));
         QCOMPARE(fileName()->text(), QString("UserTemplate_001"));
-        QCOMPARE(preview()->textLines().mid(0, 2), QStringList({"one", "two"}));
+        QCOMPARE(textLines(preview()).mid(0, 2), QStringList({"one", "two"}));
         QVERIFY(button("deleteTemplateButton")->isEnabled());
     }
 
@@ -321,7 +322,7 @@ private Q_SLOTS:
         QVERIFY(!button("selectUserButton")->isEnabled());
         QVERIFY(!button("deleteTemplateButton")->isEnabled());
         QCOMPARE(fileName()->text(), QString());
-        QCOMPARE(preview()->textLines().first(), QString());
+        QCOMPARE(textLines(preview()).first(), QString());
         answer(MessageDefine::CLOSE_OK);
         QCOMPARE(users()->count(), 4);
     }
@@ -374,14 +375,14 @@ private Q_SLOTS:
         QCOMPARE(users()->item(3)->getIndex(), 3);
         // The new one is chosen, whichever was before, and remembered.
         QCOMPARE(users()->selectedItem(), users()->item(3));
-        QVERIFY(users()->item(3)->hasSelectedStyle());
+        QVERIFY(hasSelectedStyle(users()->item(3)));
         QVERIFY(button("selectUserButton")->isEnabled() && button("deleteTemplateButton")->isEnabled());
-        QCOMPARE(preview()->textLines().first(), QString("saved"));
+        QCOMPARE(textLines(preview()).first(), QString("saved"));
         QCOMPARE(fileName()->text(), QString("UserTemplate_004"));
         tapItem(users(), 1);
         mFixture.makeUserTemplate("UserTemplate_005");
         mPicker->slotSaveAsTemplate("UserTemplate_005");
-        QVERIFY(!users()->item(1)->hasSelectedStyle());
+        QVERIFY(!hasSelectedStyle(users()->item(1)));
         QCOMPARE(users()->selectedItem(), users()->item(4));
         mPicker->reloadTemplates2();
         QCOMPARE(TemplateTab::templateName(*users()->selectedArchive()), QString("UserTemplate_005"));

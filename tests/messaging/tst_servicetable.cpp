@@ -26,6 +26,7 @@
 #include <QTest>
 
 #include <random>
+#include <set>
 
 namespace
 {
@@ -676,7 +677,7 @@ void tst_servicetable::titlerUnknownMethods()
 void tst_servicetable::tableOfServices()
 {
     QCOMPARE(ServiceTable::services().size(), std::size_t(42));
-    int adapterTypes = 0;
+    std::set<long> adapterTypes;
     long last = 0;
     for (const ServiceTable::Service& service : ServiceTable::services()) {
         QVERIFY(service.interfaceId > last);
@@ -686,17 +687,16 @@ void tst_servicetable::tableOfServices()
         QVERIFY(ServiceTable::findByInterface(service.interfaceId) == &service);
         for (const long type : {service.callBackAdapter, service.notifyAdapter}) {
             if (type != ServiceTable::NO_ADAPTER) {
-                ++adapterTypes;
-                QVERIFY(ServiceTable::findByAdapter(type) == &service);
+                QVERIFY(adapterTypes.insert(type).second);
             }
         }
     }
-    QCOMPARE(adapterTypes, 63);
+    QCOMPARE(adapterTypes.size(), std::size_t(63));
     for (const long unknown : {0L, 117L, 118L, 2L, -1L, 1000L}) {
         QVERIFY(ServiceTable::findByInterface(unknown) == nullptr);
     }
     for (const long unknown : {0L, 1L, 117L, 118L, 39L}) {
-        QVERIFY(ServiceTable::findByAdapter(unknown) == nullptr);
+        QVERIFY(!adapterTypes.contains(unknown));
     }
     QCOMPARE(QString(ServiceTable::findByInterface(110)->name), "SubPanelController");
     QCOMPARE(ServiceTable::findByInterface(110)->methods, 54);

@@ -144,13 +144,13 @@ void tst_fontcombox::tapInTheListChooses()
     QSignalSpy clear(m_box, &ToolBox::signalClearSizeBoxLineEditFocus);
     m_box->setFontFamily(QStringLiteral("KST"));
     m_environment->tap(combo());
-    QTRY_VERIFY(combo()->isPopupVisible());
+    QTRY_VERIFY(combo()->view()->isVisible());
     QCOMPARE(clear, (QList<QVariantList>{{true}}));
     CustomComboBoxView* list = combo()->listView();
     const QModelIndex row = list->model()->index(combo()->findText(QStringLiteral("DejaVu Sans")), 0);
     list->scrollTo(row);
     m_environment->touch(list->viewport(), list->visualRect(row).center());
-    QTRY_VERIFY(!combo()->isPopupVisible());
+    QTRY_VERIFY(!combo()->view()->isVisible());
     QCOMPARE(changed, (QList<QVariantList>{{"DejaVu Sans", 0}}));
     QCOMPARE(shown, (QList<QVariantList>{{true}, {false}}));
 }

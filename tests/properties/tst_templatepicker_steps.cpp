@@ -4,6 +4,7 @@
 //
 // TITLER_STEPS changes the length, TITLER_SEED the course.
 #include "tests/library/TemplateFixture.h"
+#include "tests/library/ItemLooks.h"
 
 #include "library/TemplateItem.h"
 #include "library/TemplatePicker.h"
@@ -291,7 +292,7 @@ QString tst_templatepicker_steps::verify() const
         const TemplateItem* item = tab()->item(id);
         if (item->getIndex() != id || !item->isUser())
             return QStringLiteral("item %1 is another").arg(id);
-        if (item->hasSelectedStyle() != (shown.constLast() == mChosen))
+        if (hasSelectedStyle(item) != (shown.constLast() == mChosen))
             return QStringLiteral("the frame of %1").arg(shown.constLast());
         if (QString::fromStdString(tab()->archive(id)->getPath()) != mFixture.userTitle(shown.constLast()))
             return QStringLiteral("the path of %1").arg(shown.constLast());

@@ -1,5 +1,6 @@
 // The balloons: the tool tip of sliders and rows, and those of buttons and prompts.
 #include "tests/support/Patience.h"
+#include "tests/touchui/ShownTip.h"
 #include "touchui/Balloon.h"
 #include "touchui/BalloonWindow.h"
 #include "touchui/KSToolTip.h"
@@ -28,15 +29,6 @@ private Q_SLOTS:
     void balloonWithoutWidget();
 
 private:
-    QWidget* tip() const
-    {
-        for (QWidget* widget : QApplication::topLevelWidgets()) {
-            if (widget->objectName() == QStringLiteral("KSToolTip") && widget->isVisible()) {
-                return widget;
-            }
-        }
-        return nullptr;
-    }
     QRect global(const QRect& rect) const
     {
         return QRect(m_window->mapToGlobal(rect.topLeft()), rect.size());
@@ -71,15 +63,14 @@ void tst_balloon::tipStandsOverItsAnchor()
 {
     const QRect handle = global(QRect(300, 300, 40, 40));
     KSToolTip::showTextForSlider(handle, QStringLiteral("7"));
-    QVERIFY(KSToolTip::isVisible());
-    QVERIFY(tip() != nullptr);
-    QCOMPARE(tip()->geometry().bottom() + 1, handle.top());
-    QVERIFY(qAbs(tip()->geometry().center().x() - handle.center().x()) <= 1);
-    const QImage look = tip()->grab().toImage();
+    QVERIFY(shownTip() != nullptr);
+    QCOMPARE(shownTip()->geometry().bottom() + 1, handle.top());
+    QVERIFY(qAbs(shownTip()->geometry().center().x() - handle.center().x()) <= 1);
+    const QImage look = shownTip()->grab().toImage();
     QVERIFY(look.pixelColor(look.width() / 2, look.height() - 4).alpha() > 0); // the arrow
     QCOMPARE(look.pixelColor(2, look.height() - 4).alpha(), 0);                // and nothing beside it
     KSToolTip::hideText();
-    QVERIFY(!KSToolTip::isVisible());
+    QVERIFY(shownTip() == nullptr);
     QVERIFY(KSToolTip::text().isEmpty());
 }
 
@@ -87,12 +78,12 @@ void tst_balloon::tipTurnsWhereThereIsNoRoom()
 {
     const QRect handle = global(QRect(300, 5, 40, 40));
     KSToolTip::showText(handle, QStringLiteral("7"));
-    QCOMPARE(tip()->geometry().top(), handle.bottom() + 1);
-    const QImage look = tip()->grab().toImage();
+    QCOMPARE(shownTip()->geometry().top(), handle.bottom() + 1);
+    const QImage look = shownTip()->grab().toImage();
     QVERIFY(look.pixelColor(look.width() / 2, 4).alpha() > 0);
     QCOMPARE(look.pixelColor(2, 4).alpha(), 0);
     KSToolTip::showText(global(QRect(0, 300, 10, 10)), QStringLiteral("at the edge"));
-    QVERIFY(global(m_window->rect()).contains(tip()->geometry()));
+    QVERIFY(global(m_window->rect()).contains(shownTip()->geometry()));
 }
 
 void tst_balloon::tipShortensLongText()
@@ -100,10 +91,10 @@ void tst_balloon::tipShortensLongText()
     const QString text = QStringLiteral("A very long name ").repeated(40);
     KSToolTip::showText(global(QRect(300, 300, 40, 40)), text);
     QCOMPARE(KSToolTip::text(), text);
-    QVERIFY(tip()->width() <= m_window->width());
-    QVERIFY(tip()->width() > m_window->width() * 3 / 4);
+    QVERIFY(shownTip()->width() <= m_window->width());
+    QVERIFY(shownTip()->width() > m_window->width() * 3 / 4);
     KSToolTip::showText(global(QRect(300, 300, 40, 40)), QStringLiteral("one\ntwo"));
-    QVERIFY(tip()->height() < 80);
+    QVERIFY(shownTip()->height() < 80);
 }
 
 void tst_balloon::tipOfARowShowsOnlyWhatIsCut()
@@ -111,17 +102,17 @@ void tst_balloon::tipOfARowShowsOnlyWhatIsCut()
     const QRect row = global(QRect(100, 300, 200, 40));
     const QString text = QStringLiteral("A folder's name");
     KSToolTip::showTextForTreeView(row, text, 1000);
-    QVERIFY(!KSToolTip::isVisible());
+    QVERIFY(shownTip() == nullptr);
     KSToolTip::showTextForTreeView(row, text, 20);
-    QVERIFY(KSToolTip::isVisible());
-    QCOMPARE(tip()->geometry().top(), row.bottom() + 1);
+    QVERIFY(shownTip() != nullptr);
+    QCOMPARE(shownTip()->geometry().top(), row.bottom() + 1);
 }
 
 void tst_balloon::emptyTextHides()
 {
     KSToolTip::showText(global(QRect(300, 300, 40, 40)), QStringLiteral("7"));
     KSToolTip::showText(global(QRect(300, 300, 40, 40)), QString());
-    QVERIFY(!KSToolTip::isVisible());
+    QVERIFY(shownTip() == nullptr);
     Balloon balloon;
     balloon.showButtonText(m_anchor, QStringLiteral("Delete"));
     balloon.showButtonText(m_anchor, QString());
@@ -131,8 +122,8 @@ void tst_balloon::emptyTextHides()
 void tst_balloon::tipTakesNoTouchAndNoFocus()
 {
     KSToolTip::showText(global(QRect(300, 300, 40, 40)), QStringLiteral("7"));
-    QVERIFY(tip()->windowFlags() & Qt::WindowTransparentForInput);
-    QVERIFY(tip()->windowFlags() & Qt::WindowDoesNotAcceptFocus);
+    QVERIFY(shownTip()->windowFlags() & Qt::WindowTransparentForInput);
+    QVERIFY(shownTip()->windowFlags() & Qt::WindowDoesNotAcceptFocus);
     QVERIFY(QApplication::activePopupWidget() == nullptr);
 }
 
@@ -144,8 +135,8 @@ void tst_balloon::tipFollowsANewWindow()
     other.show();
     KSToolTip::s_mainWindow = &other;
     KSToolTip::showText(QRect(other.mapToGlobal(QPoint(200, 100)), QSize(10, 10)), QStringLiteral("8"));
-    QCOMPARE(tip()->parentWidget(), &other);
-    QVERIFY(QRect(other.mapToGlobal(QPoint(0, 0)), other.size()).contains(tip()->geometry()));
+    QCOMPARE(shownTip()->parentWidget(), &other);
+    QVERIFY(QRect(other.mapToGlobal(QPoint(0, 0)), other.size()).contains(shownTip()->geometry()));
     KSToolTip::s_mainWindow = m_window.get();
 }
 

@@ -66,7 +66,7 @@ private:
     void open()
     {
         m_box->showPopup();
-        QVERIFY(m_box->isPopupVisible());
+        QVERIFY(m_box->view()->isVisible());
         QVERIFY(QTest::qWaitForWindowExposed(m_box->listView()->window(), PATIENCE_MS));
     }
 
@@ -107,10 +107,10 @@ void tst_kscombobox::tapOpensAndTapChooses()
     QSignalSpy shown(m_box, &KSCombobox::signalShowComboxList);
     QSignalSpy activated(m_box, &QComboBox::activated);
     m_touch->press(m_box, QPoint(30, 20));
-    QVERIFY(m_box->isPopupVisible());
+    QVERIFY(m_box->view()->isVisible());
     m_touch->move(m_box, QPoint(31, 20));
     m_touch->lift(m_box, QPoint(31, 20));
-    QVERIFY(m_box->isPopupVisible());
+    QVERIFY(m_box->view()->isVisible());
     QVERIFY(!m_touch->isLocked());
     QCOMPARE(popup.count(), 1);
     QCOMPARE(shown.count(), 1);
@@ -118,7 +118,7 @@ void tst_kscombobox::tapOpensAndTapChooses()
     m_touch->press(list(), rowPoint(3));
     QCOMPARE(m_box->listView()->pressedIndex().row(), 3);
     m_touch->lift(list(), rowPoint(3));
-    QVERIFY(!m_box->isPopupVisible());
+    QVERIFY(!m_box->view()->isVisible());
     QCOMPARE(m_box->currentIndex(), 3);
     QCOMPARE(activated.count(), 1);
     QCOMPARE(activated.at(0).at(0).toInt(), 3);
@@ -130,9 +130,9 @@ void tst_kscombobox::tapOpensAndTapChooses()
 void tst_kscombobox::mouseOpensAndChooses()
 {
     QTest::mouseClick(m_box, Qt::LeftButton, {}, QPoint(30, 20));
-    QVERIFY(m_box->isPopupVisible());
+    QVERIFY(m_box->view()->isVisible());
     QTest::mouseClick(list(), Qt::LeftButton, {}, rowPoint(2));
-    QVERIFY(!m_box->isPopupVisible());
+    QVERIFY(!m_box->view()->isVisible());
     QCOMPARE(m_box->currentIndex(), 2);
 }
 
@@ -142,11 +142,11 @@ void tst_kscombobox::listShowsOnlyWhenItCan()
     QSignalSpy shown(m_box, &KSCombobox::signalShowComboxList);
     m_box->setPopupEnable(false);
     m_box->showPopup();
-    QVERIFY(!m_box->isPopupVisible());
+    QVERIFY(!m_box->view()->isVisible());
     m_box->setPopupEnable(true);
     m_box->clear();
     m_box->showPopup();
-    QVERIFY(!m_box->isPopupVisible());
+    QVERIFY(!m_box->view()->isVisible());
     QCOMPARE(popup.count(), 2);
     QCOMPARE(shown.count(), 0);
     fill(2);
@@ -161,7 +161,7 @@ void tst_kscombobox::event1001Closes()
     open();
     QEvent event(static_cast<QEvent::Type>(1001));
     QCoreApplication::sendEvent(m_box, &event);
-    QVERIFY(!m_box->isPopupVisible());
+    QVERIFY(!m_box->view()->isVisible());
     QCOMPARE(shown.count(), 2);
     QCoreApplication::sendEvent(m_box, &event); // and once more, closed
     QCOMPARE(shown.count(), 2);
@@ -174,7 +174,7 @@ void tst_kscombobox::processLockRemembersTheOpenList()
     KSEventProcessLockObject::s_instance = process;
     open();
     process->slotRestoreAll(); // another process asks this one to give way
-    QVERIFY(!m_box->isPopupVisible());
+    QVERIFY(!m_box->view()->isVisible());
     process->slotRestoreAll();
     open();
     delete m_box; // with its list open
@@ -187,16 +187,16 @@ void tst_kscombobox::pressOutsideClosesAndPressesNothing()
     QSignalSpy pressed(m_button, &QAbstractButton::pressed);
     open();
     m_touch->tap(m_button, QPoint(20, 20));
-    QVERIFY(!m_box->isPopupVisible());
+    QVERIFY(!m_box->view()->isVisible());
     QCOMPARE(pressed.count(), 0);
     m_touch->tap(m_button, QPoint(20, 20));
     QCOMPARE(clicked.count(), 1);
     // A tap on the box itself closes the list, too.
     open();
     m_touch->tap(m_box, QPoint(30, 20));
-    QVERIFY(!m_box->isPopupVisible());
+    QVERIFY(!m_box->view()->isVisible());
     m_touch->tap(m_box, QPoint(30, 20));
-    QVERIFY(m_box->isPopupVisible());
+    QVERIFY(m_box->view()->isVisible());
     QVERIFY(!m_touch->isLocked());
 }
 
@@ -204,15 +204,15 @@ void tst_kscombobox::disablingClosesTheList()
 {
     open();
     m_box->setDisabled(true);
-    QVERIFY(!m_box->isPopupVisible());
+    QVERIFY(!m_box->view()->isVisible());
     m_box->showPopup();
-    QVERIFY(!m_box->isPopupVisible());
+    QVERIFY(!m_box->view()->isVisible());
     m_touch->tap(m_box, QPoint(30, 20));
-    QVERIFY(!m_box->isPopupVisible());
+    QVERIFY(!m_box->view()->isVisible());
     m_box->setEnabled(true);
     open();
     m_window->setEnabled(false); // through its parent
-    QVERIFY(!m_box->isPopupVisible());
+    QVERIFY(!m_box->view()->isVisible());
 }
 
 void tst_kscombobox::disabledRowKeepsTheListOpen()
@@ -221,7 +221,7 @@ void tst_kscombobox::disabledRowKeepsTheListOpen()
     QSignalSpy activated(m_box, &QComboBox::activated);
     open();
     m_touch->tap(list(), rowPoint(1));
-    QVERIFY(m_box->isPopupVisible());
+    QVERIFY(m_box->view()->isVisible());
     QCOMPARE(activated.count(), 0);
 }
 
@@ -248,14 +248,14 @@ void tst_kscombobox::cancelAndSecondFinger()
     QVERIFY(!m_box->listView()->pressedIndex().isValid());
     touch.release(0, rowPoint(0), list()).commit();
     QCOMPARE(activated.count(), 0);
-    QVERIFY(m_box->isPopupVisible());
+    QVERIFY(m_box->view()->isVisible());
     m_box->hidePopup();
     m_touch->press(m_box, QPoint(30, 20));
     m_box->hidePopup();
     m_touch->cancel(m_box);
     m_touch->lift(m_box, QPoint(30, 20));
     m_touch->tap(m_box, QPoint(30, 20));
-    QVERIFY(m_box->isPopupVisible());
+    QVERIFY(m_box->view()->isVisible());
 }
 
 void tst_kscombobox::width_data()
@@ -370,7 +370,7 @@ void tst_kscombobox::listFollowsTheFingerAndRunsOn()
     m_clock->advance(10000);
     QVERIFY(!m_box->listView()->isAutoFilck());
     QCOMPARE(m_clock->running(), 0);
-    QVERIFY(m_box->isPopupVisible());
+    QVERIFY(m_box->view()->isVisible());
     QCOMPARE(m_box->currentIndex(), 0);
 }
 
@@ -403,10 +403,10 @@ void tst_kscombobox::brakeChoosesNothing()
     QVERIFY(m_box->listView()->isAutoFilck());
     m_touch->tap(list(), QPoint(50, 100));
     QVERIFY(!m_box->listView()->isAutoFilck());
-    QVERIFY(m_box->isPopupVisible());
+    QVERIFY(m_box->view()->isVisible());
     QCOMPARE(m_box->currentIndex(), 0);
     m_touch->tap(list(), QPoint(50, 100));
-    QVERIFY(!m_box->isPopupVisible());
+    QVERIFY(!m_box->view()->isVisible());
     QVERIFY(m_box->currentIndex() > 0);
 }
 
@@ -424,13 +424,13 @@ void tst_kscombobox::smallMoveIsATapLargerIsNot()
     m_touch->move(list(), rowPoint(3) + QPoint(0, 6));
     m_touch->move(list(), rowPoint(3));
     m_touch->lift(list(), rowPoint(3));
-    QVERIFY(m_box->isPopupVisible());
+    QVERIFY(m_box->view()->isVisible());
     QCOMPARE(m_box->currentIndex(), 2);
     const QPoint sideways = rowPoint(3);
     m_touch->press(list(), sideways);
     m_touch->move(list(), sideways + QPoint(21, 0));
     m_touch->lift(list(), sideways + QPoint(21, 0));
-    QVERIFY(m_box->isPopupVisible());
+    QVERIFY(m_box->view()->isVisible());
 }
 
 void tst_kscombobox::mouseDragsTheList()
@@ -443,7 +443,7 @@ void tst_kscombobox::mouseDragsTheList()
     m_clock->advance(33);
     QCOMPARE(bar->value(), 100);
     QTest::mouseRelease(list(), Qt::LeftButton, {}, QPoint(50, 100));
-    QVERIFY(m_box->isPopupVisible());
+    QVERIFY(m_box->view()->isVisible());
     QCOMPARE(m_box->currentIndex(), 0);
 }
 
@@ -456,10 +456,10 @@ void tst_kscombobox::keysOfTheList()
     QTest::keyClick(popup, Qt::Key_Up);
     QTest::keyClick(popup, Qt::Key_Return);
     QCOMPARE(m_box->currentIndex(), 1);
-    QVERIFY(!m_box->isPopupVisible());
+    QVERIFY(!m_box->view()->isVisible());
     open();
     QTest::keyClick(popup, Qt::Key_Escape);
-    QVERIFY(!m_box->isPopupVisible());
+    QVERIFY(!m_box->view()->isVisible());
     QCOMPARE(m_box->currentIndex(), 1);
 }
 
@@ -482,9 +482,9 @@ void tst_kscombobox::editableBoxTakesTheTap()
     m_box->setEditable(true);
     m_box->lineEdit()->setText(QStringLiteral("text"));
     m_touch->tap(m_box, m_box->lineEdit()->geometry().center());
-    QVERIFY(!m_box->isPopupVisible());
+    QVERIFY(!m_box->view()->isVisible());
     m_touch->tap(m_box, QPoint(m_box->width() - 8, 24)); // the arrow
-    QVERIFY(m_box->isPopupVisible());
+    QVERIFY(m_box->view()->isVisible());
 }
 
 void tst_kscombobox::looks()

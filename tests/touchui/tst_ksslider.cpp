@@ -1,5 +1,6 @@
 // The slider under the finger and under the mouse.
 #include "tests/support/Patience.h"
+#include "tests/touchui/ShownTip.h"
 #include "tests/touchui/TouchFixture.h"
 #include "touchui/KSSLider.h"
 #include "touchui/KSSliderStyle.h"
@@ -172,7 +173,7 @@ void tst_ksslider::cancelLetsGo()
     m_touch->move(m_slider, centerAt(6));
     m_touch->cancel(m_slider);
     QVERIFY(!m_slider->isSliderDown());
-    QVERIFY(!KSToolTip::isVisible());
+    QVERIFY(shownTip() == nullptr);
     QCOMPARE(released.count(), 1);
     QCOMPARE(m_slider->value(), 6);
     QVERIFY(!m_touch->isLocked());
@@ -243,7 +244,7 @@ void tst_ksslider::disabledWhileHeldLetsGo()
     m_slider->setEnabled(false);
     m_touch->filter->unlock(); // its lift is kept from a disabled widget
     QVERIFY(!m_slider->isSliderDown());
-    QVERIFY(!KSToolTip::isVisible());
+    QVERIFY(shownTip() == nullptr);
     m_slider->setEnabled(true);
     m_touch->lift(m_slider, center());
     m_touch->press(m_slider, center());
@@ -256,10 +257,10 @@ void tst_ksslider::hiddenWhileHeldLetsGo()
 {
     QSignalSpy released(m_slider, &KSSLider::signalMouseRelease);
     QTest::mousePress(m_slider, Qt::LeftButton, {}, center());
-    QVERIFY(KSToolTip::isVisible());
+    QVERIFY(shownTip() != nullptr);
     m_slider->hide();
     QVERIFY(!m_slider->isSliderDown());
-    QVERIFY(!KSToolTip::isVisible());
+    QVERIFY(shownTip() == nullptr);
     QCOMPARE(released.count(), 1);
     QTest::mouseRelease(m_window.get(), Qt::LeftButton);
 }
@@ -268,12 +269,12 @@ void tst_ksslider::balloonTellsTheValue()
 {
     QSignalSpy text(m_slider, &KSSLider::signalDrawTipText);
     m_touch->press(m_slider, center());
-    QVERIFY(KSToolTip::isVisible());
+    QVERIFY(shownTip() != nullptr);
     QCOMPARE(KSToolTip::text(), QStringLiteral("0"));
     m_touch->move(m_slider, centerAt(4));
     QCOMPARE(KSToolTip::text(), QStringLiteral("4"));
     m_touch->lift(m_slider, centerAt(4));
-    QVERIFY(!KSToolTip::isVisible());
+    QVERIFY(shownTip() == nullptr);
     QCOMPARE(text.count(), 2);
     QCOMPARE(text.at(1).at(0).toString(), QStringLiteral("4"));
 }

@@ -181,7 +181,9 @@ void tst_kstabbar::looksOfTabs()
     QVERIFY(look(1) != rest);
     // A shorter string leaves the other looks like that at rest.
     m_tabs->setTabEnabled(1, true);
-    m_bar->setImages(QStringLiteral("Pane_Tab:Tab_Rest_Left:Tab_Rest_Center:Tab_Rest_Right"));
+    auto* style = qobject_cast<KSTabStyle*>(m_bar->style());
+    QVERIFY(style != nullptr);
+    style->setImages(QStringLiteral("Pane_Tab:Tab_Rest_Left:Tab_Rest_Center:Tab_Rest_Right"));
     QCOMPARE(look(0), look(1));
 }
 

@@ -1,6 +1,7 @@
 // Editors, check boxes and marks in the rows of the touch tree, and what it paints.
 #include "TreeViewFixture.h"
 #include "tests/support/Patience.h"
+#include "tests/touchui/ShownTip.h"
 
 class tst_kstreeview_editing : public TreeViewFixture
 {
@@ -229,10 +230,10 @@ void tst_kstreeview_editing::heldLongNameShowsABalloon()
     QVERIFY(m_tree->isTextElide(folder));
     m_tree->setHoldInterval(30);
     QTest::touchEvent(m_area, m_device).press(0, rowPoint(1), m_area);
-    QTRY_VERIFY(KSToolTip::isVisible());
+    QTRY_VERIFY(shownTip() != nullptr);
     QTest::touchEvent(m_area, m_device).move(0, rowPoint(1) + QPoint(0, -4), m_area);
     QTest::touchEvent(m_area, m_device).move(0, rowPoint(1) + QPoint(0, -40), m_area);
-    QVERIFY(!KSToolTip::isVisible());
+    QVERIFY(shownTip() == nullptr);
     QTest::touchEvent(m_area, m_device).release(0, rowPoint(1) + QPoint(0, -40), m_area);
     KSToolTip::clearInstance();
 }

@@ -134,10 +134,10 @@ void tst_nineslice::framePaintsEveryPixelAtEverySize()
 
 void tst_nineslice::missingPiecesStayUndrawn()
 {
-    QVERIFY(SliceFrame().isNull());
-    QVERIFY(SliceFrame(QStringList{QStringLiteral("one")}).isNull());
+    QVERIFY(SliceFrame().corners().isNull());
+    QVERIFY(SliceFrame(QStringList{QStringLiteral("one")}).corners().isNull());
     const SliceFrame frame(SliceFrame::family(QStringLiteral(":/nowhere/")));
-    QVERIFY(frame.isNull());
+    QVERIFY(frame.corners().isNull());
     QImage image(30, 30, QImage::Format_ARGB32_Premultiplied);
     image.fill(Qt::transparent);
     QPainter painter(&image);
@@ -162,7 +162,7 @@ void tst_nineslice::libraryFramesHaveNoSeams()
     Q_INIT_RESOURCE(UILibrary);
     QFETCH(QString, prefix);
     const SliceFrame frame(SliceFrame::family(prefix));
-    QVERIFY(!frame.isNull());
+    QVERIFY(!frame.corners().isNull());
     const QMargins corners = frame.corners();
     for (const QSize& size :
          {QSize(corners.left() + corners.right() + 1, 90), QSize(301, 77), QSize(1920, 1080)}) {
