@@ -36,7 +36,7 @@ const char LABEL_STYLE[] = "background-color:transparent; color:rgb(220, 220, 22
 const char LABEL_DISABLED_STYLE[] = "background-color:transparent; color:rgb(102, 102, 102); font:20px;";
 
 // No background at rest and while disabled.
-const char BUTTON_IMAGES[] =
+const char TOOL_IMAGES[] =
     "ToolsBar_Buttons::::"
     "Button_67_Pressed_Left:Button_67_Pressed_Center:Button_67_Pressed_Right::::"
     "Button_67selected_Rest_Left:Button_67selected_Rest_Center:Button_67selected_Rest_Right:"
@@ -71,7 +71,7 @@ ToolsBar::ToolButton ToolsBar::createButton(const QString& iconName, const QPoin
     ToolButton tool;
     tool.icon = QIcon(QStringLiteral(":/Icon_") + iconName);
     tool.disabledIcon = QIcon(QStringLiteral(":/Icon_Disabled_") + iconName);
-    tool.button = new KSPushbutton(QString::fromLatin1(BUTTON_IMAGES), this);
+    tool.button = new KSPushbutton(QString::fromLatin1(TOOL_IMAGES), this);
     tool.button->setObjectName(iconName);
     tool.button->setFixedSize(TOOLBARBTN_SIZE);
     tool.button->setIconSize(BAR_ICON_SIZE);

@@ -18,7 +18,6 @@ namespace
 
 constexpr int HANDLE_SIZE = 22;
 constexpr int HANDLE_LEFT = 6;
-const QString HANDLE_PICTURE = QStringLiteral(":/MainButtons/Main_Move_Handle");
 
 // Returns the position of the press in global coordinates.
 QPoint pressPosition(const QEvent* event)
@@ -45,7 +44,7 @@ KSBaseItemWidget::KSBaseItemWidget(QWidget* parent)
 QLabel* KSBaseItemWidget::makeHandle()
 {
     auto* handle = new QLabel(this);
-    handle->setPixmap(QPixmap(HANDLE_PICTURE));
+    handle->setPixmap(QPixmap(QStringLiteral(":/MainButtons/Main_Move_Handle")));
     handle->setStyleSheet(QStringLiteral("background-color: rgb(51, 51, 51)"));
     handle->setAttribute(Qt::WA_TransparentForMouseEvents);
     handle->hide();
@@ -157,6 +156,8 @@ void KSBaseItemWidget::setPopup(bool popup)
 {
     m_shadow->setEnabled(popup);
     m_popup = popup;
+    if (popup && m_dragBase.front().isNull())
+        loadDragBase();
     // Hide the handle: its background would be visible on the lifted look, which paints the handle itself.
     if (m_handle)
         m_handle->setVisible(m_dragFlag && !popup);
@@ -308,11 +309,16 @@ void KSBaseItemWidget::paintEvent(QPaintEvent*)
     paintDragFlag(painter);
 }
 
+void KSBaseItemWidget::loadDragBase()
+{
+    m_dragBase = {QPixmap(QStringLiteral(":/MainButtons/Main_drag_base_Left")),
+                  QPixmap(QStringLiteral(":/MainButtons/Main_drag_base_Center")),
+                  QPixmap(QStringLiteral(":/MainButtons/Main_drag_base_Right"))};
+}
+
 void KSBaseItemWidget::paintDragBase(QPainter& painter)
 {
-    const QPixmap left(QStringLiteral(":/MainButtons/Main_drag_base_Left"));
-    const QPixmap center(QStringLiteral(":/MainButtons/Main_drag_base_Center"));
-    const QPixmap right(QStringLiteral(":/MainButtons/Main_drag_base_Right"));
+    const auto& [left, center, right] = m_dragBase;
     painter.drawPixmap(QRect(0, 0, left.width(), height()), left);
     painter.drawPixmap(QRect(left.width(), 0, width() - left.width() - right.width(), height()), center);
     painter.drawPixmap(QRect(width() - right.width(), 0, right.width(), height()), right);
@@ -320,6 +326,6 @@ void KSBaseItemWidget::paintDragBase(QPainter& painter)
 
 void KSBaseItemWidget::paintDragFlag(QPainter& painter)
 {
-    if (m_dragFlag && m_alignment != DRAGFLAG_NONE)
-        painter.drawPixmap(getHandlePos(), QPixmap(HANDLE_PICTURE));
+    if (m_dragFlag && m_handle && m_alignment != DRAGFLAG_NONE)
+        painter.drawPixmap(getHandlePos(), m_handle->pixmap());
 }

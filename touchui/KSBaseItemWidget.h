@@ -2,9 +2,11 @@
 
 #include "touchui/KSPushbutton.h"
 
+#include <QPixmap>
 #include <QPointer>
 #include <QRect>
 #include <QSize>
+#include <array>
 
 class QGraphicsDropShadowEffect;
 class QHBoxLayout;
@@ -80,6 +82,7 @@ private:
     void updateDragArea();
     int handleTop() const;
     QLabel* makeHandle();
+    void loadDragBase();
 
     QPointer<QWidget> m_left;
     QPointer<QWidget> m_right;
@@ -96,5 +99,6 @@ private:
     QRect m_dragArea;
     bool m_hasFocus = false;
     QLabel* m_handle = nullptr;
+    std::array<QPixmap, 3> m_dragBase; // left, centre and right; loaded when the item is first lifted
     QGraphicsDropShadowEffect* m_shadow = nullptr; // owned by the widget
 };
