@@ -26,6 +26,9 @@ GraphicsView::GraphicsView(QGraphicsScene* scene, QWidget* parent) : QGraphicsVi
     m_clickTimer.setSingleShot(true);
     m_clickTimer.setInterval(DoubleTouchTime);
     connect(&m_clickTimer, &QTimer::timeout, this, &GraphicsView::mouseClick);
+    connect(&m_finger, &OneFinger::began, this, &GraphicsView::touchBegin);
+    connect(&m_finger, &OneFinger::moved, this, &GraphicsView::touchUpdate);
+    connect(&m_finger, &OneFinger::lifted, this, &GraphicsView::touchEnd);
     connect(&m_finger, &OneFinger::cancelled, this, &GraphicsView::rest);
 }
 
@@ -36,33 +39,9 @@ void GraphicsView::mouseClick()
 
 bool GraphicsView::viewportEvent(QEvent* event)
 {
-    switch (event->type()) {
-    case QEvent::TouchBegin:
-    case QEvent::TouchUpdate:
-    case QEvent::TouchEnd:
-    case QEvent::TouchCancel:
-        onTouchEvent(static_cast<QTouchEvent&>(*event));
-        return true;
-    default:
-        return QGraphicsView::viewportEvent(event);
-    }
-}
-
-void GraphicsView::onTouchEvent(const QTouchEvent& touch)
-{
-    switch (m_finger.follow(&touch)) {
-    case OneFinger::Step::Begin:
-        touchBegin(touch);
-        break;
-    case OneFinger::Step::Move:
-        touchUpdate(touch);
-        break;
-    case OneFinger::Step::End:
-        touchEnd(touch);
-        break;
-    case OneFinger::Step::None:
-        break;
-    }
+    if (OneFinger::isTouch(event))
+        m_modifiers = static_cast<QTouchEvent*>(event)->modifiers();
+    return m_finger.takes(event) || QGraphicsView::viewportEvent(event);
 }
 
 QPoint GraphicsView::fingerPosition() const
@@ -83,15 +62,14 @@ void GraphicsView::rest()
         item->ungrabMouse();
 }
 
-void GraphicsView::touchBegin(const QTouchEvent& touch)
+void GraphicsView::touchBegin()
 {
     const bool second = m_clickTimer.isActive();
     const QPoint position = fingerPosition();
     m_lastPressX = position.x();
     m_lastPressY = position.y();
     const QEvent::Type type = second ? QEvent::MouseButtonDblClick : QEvent::MouseButtonPress;
-    QMouseEvent mouse =
-        mouseEventAt(type, position, viewport(), Qt::LeftButton, Qt::LeftButton, touch.modifiers());
+    QMouseEvent mouse = mouseEventAt(type, position, viewport(), Qt::LeftButton, Qt::LeftButton, m_modifiers);
     if (second) {
         mouseDoubleClickEvent(&mouse);
     } else {
@@ -100,23 +78,23 @@ void GraphicsView::touchBegin(const QTouchEvent& touch)
     }
 }
 
-void GraphicsView::touchUpdate(const QTouchEvent& touch)
+void GraphicsView::touchUpdate()
 {
     const QPoint position = fingerPosition();
     const QPoint moved = position - QPoint(m_lastPressX, m_lastPressY);
     if (moved.manhattanLength() <= QApplication::startDragDistance())
         return;
-    QMouseEvent mouse = mouseEventAt(QEvent::MouseMove, position, viewport(), Qt::NoButton, Qt::LeftButton,
-                                     touch.modifiers());
+    QMouseEvent mouse =
+        mouseEventAt(QEvent::MouseMove, position, viewport(), Qt::NoButton, Qt::LeftButton, m_modifiers);
     mouseMoveEvent(&mouse);
 }
 
-void GraphicsView::touchEnd(const QTouchEvent& touch)
+void GraphicsView::touchEnd()
 {
     Q_EMIT deleteEmptyItem();
     const QPoint position = fingerPosition();
     QMouseEvent mouse = mouseEventAt(QEvent::MouseButtonRelease, position, viewport(), Qt::LeftButton,
-                                     Qt::NoButton, touch.modifiers());
+                                     Qt::NoButton, m_modifiers);
     mouseReleaseEvent(&mouse);
 }
 

@@ -5,8 +5,6 @@
 #include <QGraphicsView>
 #include <QTimer>
 
-class QTouchEvent;
-
 // The view of the canvas: turns the first finger into mouse events for the scene. Two touches within 350 ms
 // are a double click; movements within the drag distance are dropped as jitter. A cancelled touch selects
 // nothing, and an object that it dragged returns to its place.
@@ -35,14 +33,14 @@ protected:
     void mouseDoubleClickEvent(QMouseEvent* event) override;
 
 private:
-    void onTouchEvent(const QTouchEvent& touch);
     QPoint fingerPosition() const;
     void rest();
-    void touchBegin(const QTouchEvent& touch);
-    void touchUpdate(const QTouchEvent& touch);
-    void touchEnd(const QTouchEvent& touch);
+    void touchBegin();
+    void touchUpdate();
+    void touchEnd();
 
     OneFinger m_finger{this};
+    Qt::KeyboardModifiers m_modifiers; // of the last touch event
     QTimer m_clickTimer;
     // Widget coordinates of the viewport.
     int m_lastPressX = 0;

@@ -12,7 +12,6 @@
 #include <QLabel>
 #include <QMouseEvent>
 #include <QPainter>
-#include <QTouchEvent>
 #include <QVBoxLayout>
 
 const QString ColorPalette::PALETTE_LABEL_STYLE = QStringLiteral("color:rgb(220, 220, 220); font-size:24px;");
@@ -43,6 +42,12 @@ ColorPalette::ColorPalette(QWidget* parent) : QDialog(parent, Qt::Dialog | Qt::F
     setObjectName(QStringLiteral("ColorPalette"));
     setFixedSize(PALETTE_WIDTH, PALETTE_HEIGHT);
     setAttribute(Qt::WA_AcceptTouchEvents);
+    connect(&m_finger, &OneFinger::began, this, [this] {
+        m_placeAtPress = pos();
+        startDrag(m_finger.positionIn(this).toPoint(), m_finger.position().toPoint());
+    });
+    connect(&m_finger, &OneFinger::moved, this, [this] { drag(m_finger.position().toPoint()); });
+    connect(&m_finger, &OneFinger::lifted, this, [this] { m_pressedObjectName.clear(); });
     connect(&m_finger, &OneFinger::cancelled, this, &ColorPalette::putBack);
     new WindowPlaceKeeper(this); // owned by this widget
     initColorValueList();
@@ -245,35 +250,10 @@ void ColorPalette::drawFocusBoundingRect(QPainter& painter) const
 // Handles a finger on the palette like a mouse; the buttons handle their own touches.
 bool ColorPalette::event(QEvent* event)
 {
-    switch (event->type()) {
-    case QEvent::TouchBegin:
-    case QEvent::TouchUpdate:
-    case QEvent::TouchEnd:
-    case QEvent::TouchCancel:
-        event->accept();
-        return onTouchEvent(static_cast<QTouchEvent*>(event));
-    default:
+    if (!OneFinger::isTouch(event))
         return QDialog::event(event);
-    }
-}
-
-bool ColorPalette::onTouchEvent(const QTouchEvent* event)
-{
-    switch (m_finger.follow(event)) {
-    case OneFinger::Step::Begin:
-        m_placeAtPress = pos();
-        startDrag(m_finger.positionIn(this).toPoint(), m_finger.position().toPoint());
-        break;
-    case OneFinger::Step::Move:
-        drag(m_finger.position().toPoint());
-        break;
-    case OneFinger::Step::End:
-        m_pressedObjectName.clear();
-        break;
-    case OneFinger::Step::None:
-        break;
-    }
-    return true;
+    event->accept();
+    return m_finger.takes(event);
 }
 
 void ColorPalette::putBack()

@@ -14,7 +14,6 @@ class ColorButton;
 class KSPushbutton;
 class QLabel;
 class QPainter;
-class QTouchEvent;
 
 // A palette of thirty colours, for the text and for its edge. A tap on a colour previews it at once; OK keeps
 // it, Cancel restores the colour from when the palette was opened. Dragging the palette itself moves it
@@ -86,7 +85,6 @@ private:
     void closePalette();
     void drawFocusBoundingRect(QPainter& painter) const;
     void drawHorizontalLine(QPainter& painter, const QRect& line) const;
-    bool onTouchEvent(const QTouchEvent* event);
     void putBack();
     void startDrag(const QPoint& local, const QPoint& global);
     void drag(const QPoint& global);

@@ -15,7 +15,6 @@
 #include <QKeyEvent>
 #include <QLabel>
 #include <QRegularExpression>
-#include <QTouchEvent>
 
 #include <utility>
 
@@ -83,6 +82,7 @@ void SizeToolBox::createBox()
     m_edit->setReadOnly(true);
     m_edit->installEventFilter(this);
     m_finger = std::make_unique<OneFinger>(m_edit);
+    connect(m_finger.get(), &OneFinger::acted, this, &SizeToolBox::actOnLineEdit);
     connect(m_finger.get(), &OneFinger::cancelled, this, &SizeToolBox::letGoOfLineEdit);
     m_box->installEventFilter(this);
 
@@ -248,13 +248,11 @@ bool SizeToolBox::eventFilter(QObject* object, QEvent* event)
 // Turns a finger on the field into mouse events. Touches outside the field go to the box.
 bool SizeToolBox::doLineEditEvent(QEvent* event)
 {
-    switch (event->type()) {
-    case QEvent::TouchBegin:
-    case QEvent::TouchUpdate:
-    case QEvent::TouchEnd:
-    case QEvent::TouchCancel:
+    if (OneFinger::isTouch(event)) {
         event->accept();
-        return onTouchEvent(static_cast<QTouchEvent*>(event));
+        return m_finger->takes(event);
+    }
+    switch (event->type()) {
     case QEvent::MouseButtonPress:
     case QEvent::MouseButtonDblClick:
         if (!isBoxEnabled())
@@ -272,27 +270,15 @@ bool SizeToolBox::doLineEditEvent(QEvent* event)
     }
 }
 
-bool SizeToolBox::onTouchEvent(const QTouchEvent* event)
+// Called for each step of the finger.
+void SizeToolBox::actOnLineEdit(QEvent::Type mouse)
 {
     const bool wasEditing = isEditing();
-    switch (m_finger->follow(event)) {
-    case OneFinger::Step::Begin:
-        sendMouseToLineEdit(QEvent::MouseButtonPress, m_finger->positionIn(m_edit));
-        if (!wasEditing && m_state == State::Valid)
-            m_state = State::Touched;
-        break;
-    case OneFinger::Step::Move:
-        sendMouseToLineEdit(QEvent::MouseMove, m_finger->positionIn(m_edit));
-        break;
-    case OneFinger::Step::End:
-        sendMouseToLineEdit(QEvent::MouseButtonRelease, m_finger->positionIn(m_edit));
-        if (m_state == State::Touched)
-            m_state = State::Valid;
-        break;
-    case OneFinger::Step::None:
-        break;
-    }
-    return true;
+    sendMouseToLineEdit(mouse, m_finger->positionIn(m_edit));
+    if (mouse == QEvent::MouseButtonPress && !wasEditing && m_state == State::Valid)
+        m_state = State::Touched;
+    else if (mouse == QEvent::MouseButtonRelease && m_state == State::Touched)
+        m_state = State::Valid;
 }
 
 void SizeToolBox::sendMouseToLineEdit(QEvent::Type type, const QPointF& position)

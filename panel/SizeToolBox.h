@@ -10,7 +10,6 @@
 
 class KSCombobox;
 class OneFinger;
-class QTouchEvent;
 class SizeBoxLineEdit;
 
 // Sets the font size: a box to choose from a list or to type in, and two buttons for the next and previous
@@ -90,7 +89,7 @@ private:
 
     // Typing
     bool doLineEditEvent(QEvent* event);
-    bool onTouchEvent(const QTouchEvent* event);
+    void actOnLineEdit(QEvent::Type mouse);
     void sendMouseToLineEdit(QEvent::Type type, const QPointF& position);
     void letGoOfLineEdit();
     void setFocusForLineEdit();
