@@ -78,9 +78,9 @@ struct Canvas {
     GraphicsText* text = nullptr; // owned by the scene
 };
 
-constexpr BenchTitles::Look OutlinedText{
+constexpr BenchTitles::Look OUTLINED_TEXT{
     .characters = CHARACTERS, .size = 48, .edgeWidth = 4, .shadow = true, .mixed = true};
-constexpr BenchTitles::Look PlainText{
+constexpr BenchTitles::Look PLAIN_TEXT{
     .characters = CHARACTERS, .size = 48, .edgeWidth = 0, .shadow = false, .mixed = true};
 
 // Measures dragging an object of the canvas to and fro with a finger that is down already.
@@ -104,14 +104,14 @@ void drag(benchmark::State& state, QGraphicsView& view, QPoint from, const std::
 
 void dragText(benchmark::State& state)
 {
-    Canvas canvas(OutlinedText);
+    Canvas canvas(OUTLINED_TEXT);
     drag(state, canvas.view, canvas.view.mapFromScene(canvas.text->sceneBoundingRect().center()),
          [&canvas] { return canvas.text->scenePos(); });
 }
 
 void dragPixmap(benchmark::State& state)
 {
-    Canvas canvas(OutlinedText);
+    Canvas canvas(OUTLINED_TEXT);
     const QRectF area = canvas.text->sceneBoundingRect();
     QPixmap pixmap(area.size().toSize());
     pixmap.fill(Qt::transparent);
@@ -148,7 +148,7 @@ void selectAll(GraphicsText& text)
 
 void changeStyle(benchmark::State& state)
 {
-    Canvas canvas(PlainText);
+    Canvas canvas(PLAIN_TEXT);
     canvas.stack.setUndoLimit(25);
     selectAll(*canvas.text);
     TText sources[] = {withBold(*canvas.text->getItemTText(), true),
@@ -166,7 +166,7 @@ void changeStyle(benchmark::State& state)
 
 void undoStyle(benchmark::State& state)
 {
-    Canvas canvas(PlainText);
+    Canvas canvas(PLAIN_TEXT);
     TText source = withBold(*canvas.text->getItemTText(), true);
     selectAll(*canvas.text);
     canvas.scene.slotChangeObjectTextStyle(&source, TextObjectConstants::PropertyBold, 1);
@@ -208,7 +208,7 @@ std::vector<PlainRun> runsOf(const TText& record)
 
 void setPlainText(benchmark::State& state)
 {
-    const std::vector<PlainRun> runs = runsOf(*BenchTitles::text(OBJECT, 100, 60, PlainText));
+    const std::vector<PlainRun> runs = runsOf(*BenchTitles::text(OBJECT, 100, 60, PLAIN_TEXT));
     QGraphicsScene scene(QRectF(QPointF(0, 0), CANVAS));
     auto* item = new QGraphicsTextItem;
     scene.addItem(item);

@@ -44,8 +44,8 @@ using namespace TextObjectConstants;
 namespace
 {
 
-constexpr int SafeAreaAboveTexts = 4;
-constexpr double SamePlace = 1e-12;
+constexpr int SAFE_AREA_ABOVE_TEXTS = 4;
+constexpr double SAME_PLACE = 1e-12;
 
 } // namespace
 
@@ -277,7 +277,7 @@ int CanvasScene::initCGraphicsTextItem()
     const QPointF place = m_pairs->getInitItemScenePosition();
     m_topZ = int(m_texts->maxZValue()) + 1;
     addText(m_pairs->makeNew(id, place, m_topZ, *m_newTextStyle));
-    setSafeAreaRectLineZValue(m_topZ + SafeAreaAboveTexts);
+    setSafeAreaRectLineZValue(m_topZ + SAFE_AREA_ABOVE_TEXTS);
     return id;
 }
 
@@ -364,7 +364,7 @@ void CanvasScene::slotCreateEditUndoCommand(TText* oldText, TText* newText, TTex
 
 void CanvasScene::slotCreateMoveUndoCommand(int id, QPointF from, QPointF to)
 {
-    if (std::abs(from.x() - to.x()) <= SamePlace && std::abs(from.y() - to.y()) <= SamePlace)
+    if (std::abs(from.x() - to.x()) <= SAME_PLACE && std::abs(from.y() - to.y()) <= SAME_PLACE)
         return;
     setCurrentEditItemId(id);
     pushCommand(new MoveItemCommand(this, id, from, to));
@@ -580,7 +580,7 @@ void CanvasScene::slotShowCanvasBG(QAction* action)
 
 void CanvasScene::drawSafeAreaRect()
 {
-    m_safeArea->draw(m_topZ + SafeAreaAboveTexts);
+    m_safeArea->draw(m_topZ + SAFE_AREA_ABOVE_TEXTS);
 }
 
 void CanvasScene::removeSafeAreaRect()

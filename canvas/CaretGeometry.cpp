@@ -9,8 +9,8 @@ namespace
 {
 // The caret is drawn one pixel right of its character; the last line ends three pixels above the lower
 // margin.
-constexpr double CaretShift = 1.0;
-constexpr double LastLineLift = 3.0;
+constexpr double CARET_SHIFT = 1.0;
+constexpr double LAST_LINE_LIFT = 3.0;
 
 QTextLine lineOf(const QTextBlock& block, int column)
 {
@@ -51,7 +51,7 @@ double CaretGeometry::bottomOf(const QTextBlock& block, const QTextLine& line) c
 {
     const double margin = m_document.documentMargin();
     if (!block.next().isValid() && line.lineNumber() == block.layout()->lineCount() - 1)
-        return m_documentHeight - LastLineLift - margin;
+        return m_documentHeight - LAST_LINE_LIFT - margin;
     return line.y() + line.height() + margin + m_heightsAbove[size_t(block.blockNumber())];
 }
 
@@ -67,7 +67,7 @@ bool CaretGeometry::caretPoint(QLineF& line, QPointF& point, int& block, int pos
     const QTextLine textLine = lineOf(textBlock, column);
     if (!textLine.isValid())
         return false;
-    const double x = textLine.cursorToX(column) + CaretShift + m_document.documentMargin();
+    const double x = textLine.cursorToX(column) + CARET_SHIFT + m_document.documentMargin();
     const double bottom = bottomOf(textBlock, textLine);
     line = QLineF(x, bottom - textLine.height(), x, bottom);
     point = QPointF(x - TextObjectConstants::HANDLEPIXMAPWIDTH / 2.0, bottom);
@@ -85,6 +85,6 @@ void CaretGeometry::caretsOfBlock(const QTextBlock& block, std::vector<Caret>& c
         const QTextLine line = block.layout()->lineAt(i);
         const double top = bottomOf(block, line) - line.height();
         for (int column = line.textStart(); column < line.textStart() + line.textLength(); ++column)
-            carets[size_t(column)] = {line.cursorToX(column) + CaretShift + margin, top, line.height()};
+            carets[size_t(column)] = {line.cursorToX(column) + CARET_SHIFT + margin, top, line.height()};
     }
 }

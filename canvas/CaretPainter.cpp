@@ -20,12 +20,12 @@ using namespace TextObjectConstants;
 namespace
 {
 
-const QColor CaretColor(0, 232, 0);
+const QColor CARET_COLOR(0, 232, 0);
 const QColor DraggedSelection(Qt::darkBlue);
-constexpr double CaretWidth = 2.0;
-constexpr double HandleLineWidth = 3.0;
-constexpr double BaselineShare = 0.85;
-constexpr double CaretOverhang = 3.0;
+constexpr double CARET_WIDTH = 2.0;
+constexpr double HANDLE_LINE_WIDTH = 3.0;
+constexpr double BASELINE_SHARE = 0.85;
+constexpr double CARET_OVERHANG = 3.0;
 
 const QPixmap& unpressedPicture()
 {
@@ -151,10 +151,10 @@ void CaretPainter::paintCursor(QPainter* painter) const
         style ? CharacterFormat::font(*style, m_parts.surface.canvasRatio()) : m_parts.document.defaultFont();
     const double length = caret.line.length();
     const double top = caret.line.y1();
-    const double ascentTop = top + BaselineShare * length - QFontMetricsF(font).height() - CaretOverhang;
-    painter->setPen(QPen(CaretColor, CaretWidth));
+    const double ascentTop = top + BASELINE_SHARE * length - QFontMetricsF(font).height() - CARET_OVERHANG;
+    painter->setPen(QPen(CARET_COLOR, CARET_WIDTH));
     painter->drawLine(
-        QLineF(caret.line.x1(), std::max(top, ascentTop), caret.line.x1(), top + length + CaretOverhang));
+        QLineF(caret.line.x1(), std::max(top, ascentTop), caret.line.x1(), top + length + CARET_OVERHANG));
 }
 
 void CaretPainter::drawHandle(QPainter* painter, const TouchState::End& end, const QPixmap& picture)
@@ -165,7 +165,7 @@ void CaretPainter::drawHandle(QPainter* painter, const TouchState::End& end, con
 
 void CaretPainter::paintMovingHandles(QPainter* painter) const
 {
-    painter->setPen(QPen(CaretColor, HandleLineWidth));
+    painter->setPen(QPen(CARET_COLOR, HANDLE_LINE_WIDTH));
     painter->drawLine(m_state.previous.line);
     painter->drawLine(m_state.current.line);
     drawHandle(painter, m_state.previous, unpressedPicture());
@@ -175,7 +175,7 @@ void CaretPainter::paintMovingHandles(QPainter* painter) const
 void CaretPainter::showCursorForSelecting(QPainter* painter)
 {
     refreshHandles();
-    painter->setPen(QPen(CaretColor, HandleLineWidth));
+    painter->setPen(QPen(CARET_COLOR, HANDLE_LINE_WIDTH));
     drawCurPosPixmap(painter);
     if (!m_parts.surface.selection().hasSelection())
         return;

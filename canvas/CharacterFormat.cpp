@@ -15,9 +15,9 @@
 namespace
 {
 
-constexpr int MaximumKerning = 1000;
-constexpr int MaximumOutline = 200;
-constexpr int CachedFonts = 128;
+constexpr int MAXIMUM_KERNING = 1000;
+constexpr int MAXIMUM_OUTLINE = 200;
+constexpr int CACHED_FONTS = 128;
 
 struct FontKey {
     QString family;
@@ -36,7 +36,7 @@ size_t qHash(const FontKey& key, size_t seed)
 
 struct FontStore {
     QHash<QString, bool> installed;
-    QCache<FontKey, QFont> fonts{CachedFonts};
+    QCache<FontKey, QFont> fonts{CACHED_FONTS};
 };
 
 FontStore& store()
@@ -61,7 +61,7 @@ FontStore& store()
 
 int kerning(const TextStyle& style)
 {
-    return std::clamp(style.getTextKerning(), 0, MaximumKerning);
+    return std::clamp(style.getTextKerning(), 0, MAXIMUM_KERNING);
 }
 
 } // namespace
@@ -74,7 +74,7 @@ bool CharacterFormat::familyIsInstalled(const QString& family)
     auto found = installed.constFind(family);
     if (found == installed.constEnd()) {
         // Family names come from files, so the cache is bounded.
-        if (installed.size() > CachedFonts)
+        if (installed.size() > CACHED_FONTS)
             installed.clear();
         const QFont font(family);
         found = installed.insert(family, QFontInfo(font).family() == font.family());
@@ -129,5 +129,5 @@ QColor CharacterFormat::color(const std::string& text)
 
 int CharacterFormat::outlineWidth(const TextStyle& style, double ratio)
 {
-    return int(2 * std::clamp(style.textEdge().getEdgeWidth(), 0, MaximumOutline) * ratio);
+    return int(2 * std::clamp(style.textEdge().getEdgeWidth(), 0, MAXIMUM_OUTLINE) * ratio);
 }

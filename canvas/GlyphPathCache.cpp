@@ -13,8 +13,8 @@ namespace
 {
 
 // Large enough for the distinct characters of two titles in both sizes.
-constexpr int CacheBytes = 2 * 1024 * 1024;
-constexpr int RememberedPenWidths = 2;
+constexpr int CACHE_BYTES = 2 * 1024 * 1024;
+constexpr int REMEMBERED_PEN_WIDTHS = 2;
 
 struct GlyphKey {
     QString family;
@@ -45,7 +45,7 @@ struct GlyphStore {
     using Entry = std::shared_ptr<const GlyphPath>;
 
     QHash<QString, bool> pictureFonts; // by family
-    QCache<GlyphKey, Entry> glyphs{CacheBytes};
+    QCache<GlyphKey, Entry> glyphs{CACHE_BYTES};
 
     void clear()
     {
@@ -148,7 +148,7 @@ const QPainterPath& GlyphPath::outline(int penWidth) const
                                     [penWidth](const auto& o) { return o->penWidth == penWidth; });
     if (known != m_outlines.end())
         return (*known)->area;
-    if (m_outlines.size() >= RememberedPenWidths)
+    if (m_outlines.size() >= REMEMBERED_PEN_WIDTHS)
         m_outlines.erase(m_outlines.begin());
     QPainterPathStroker stroker;
     stroker.setWidth(penWidth);

@@ -10,7 +10,7 @@
 namespace
 {
 // Milliseconds within which a second touch makes a double click.
-constexpr int DoubleTouchTime = 350;
+constexpr int DOUBLE_TOUCH_TIME = 350;
 
 QMouseEvent mouseEventAt(QEvent::Type type, QPoint position, const QWidget* viewport, Qt::MouseButton button,
                          Qt::MouseButtons buttons, Qt::KeyboardModifiers modifiers)
@@ -24,7 +24,7 @@ GraphicsView::GraphicsView(QGraphicsScene* scene, QWidget* parent) : QGraphicsVi
     setAttribute(Qt::WA_AcceptTouchEvents);
     viewport()->setAttribute(Qt::WA_AcceptTouchEvents);
     m_clickTimer.setSingleShot(true);
-    m_clickTimer.setInterval(DoubleTouchTime);
+    m_clickTimer.setInterval(DOUBLE_TOUCH_TIME);
     connect(&m_clickTimer, &QTimer::timeout, this, &GraphicsView::mouseClick);
     connect(&m_finger, &OneFinger::began, this, &GraphicsView::touchBegin);
     connect(&m_finger, &OneFinger::moved, this, &GraphicsView::touchUpdate);

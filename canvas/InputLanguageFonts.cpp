@@ -3,18 +3,18 @@
 namespace
 {
 
-const QString ChineseFamily = QStringLiteral("DFHeiW5-A");
-const QString LatinFamily = QStringLiteral("KST");
-const QString JapaneseFamily = QStringLiteral("KST Japanese Pro");
-const QString KoreanFamily = QStringLiteral("YDGothic 100 Pro");
+const QString CHINESE_FAMILY = QStringLiteral("DFHeiW5-A");
+const QString LATIN_FAMILY = QStringLiteral("KST");
+const QString JAPANESE_FAMILY = QStringLiteral("KST Japanese Pro");
+const QString KOREAN_FAMILY = QStringLiteral("YDGothic 100 Pro");
 
 InputLanguageFonts::FontTable defaultTable()
 {
-    return {{{ChineseFamily, ChineseFamily},
-             {LatinFamily, ChineseFamily},
-             {LatinFamily, JapaneseFamily},
-             {LatinFamily, KoreanFamily},
-             {LatinFamily, LatinFamily}}};
+    return {{{CHINESE_FAMILY, CHINESE_FAMILY},
+             {LATIN_FAMILY, CHINESE_FAMILY},
+             {LATIN_FAMILY, JAPANESE_FAMILY},
+             {LATIN_FAMILY, KOREAN_FAMILY},
+             {LATIN_FAMILY, LATIN_FAMILY}}};
 }
 
 struct Range {
@@ -22,7 +22,7 @@ struct Range {
     char16_t last;
 };
 
-constexpr Range LatinRanges[] = {
+constexpr Range LATIN_RANGES[] = {
     {0x0020, 0x007E}, // printable ASCII
     {0x0100, 0x017F}, // Latin Extended-A
     {0x0180, 0x024F}, // Latin Extended-B
@@ -58,7 +58,7 @@ int InputLanguageFonts::languageRow(SystemSetupDef::emInputLanguageType language
 
 int InputLanguageFonts::getSoftkeyboardMode(QChar character)
 {
-    for (const Range& range : LatinRanges) {
+    for (const Range& range : LATIN_RANGES) {
         if (character.unicode() >= range.first && character.unicode() <= range.last)
             return Latin;
     }

@@ -11,9 +11,9 @@ using namespace TextObjectConstants;
 namespace
 {
 
-constexpr int NewTextKeyboard = 0;
-constexpr int EditKeyboard = 1;
-constexpr int WholeTextSelected = 2;
+constexpr int NEW_TEXT_KEYBOARD = 0;
+constexpr int EDIT_KEYBOARD = 1;
+constexpr int WHOLE_TEXT_SELECTED = 2;
 
 SubCommonDefine::tagSoftKeyBoardInitData fieldData(const QString& title, const QString& text,
                                                    int keyboardType)
@@ -27,7 +27,7 @@ SubCommonDefine::tagSoftKeyBoardInitData fieldData(const QString& title, const Q
     data.textLength = -1;
     data.selectionStart = -1;
     data.selectionEnd = -1;
-    data.selectionMode = WholeTextSelected;
+    data.selectionMode = WHOLE_TEXT_SELECTED;
     data.lastValue = CHARACTER_LIMIT;
     return data;
 }
@@ -36,17 +36,17 @@ SubCommonDefine::tagSoftKeyBoardInitData fieldData(const QString& title, const Q
 
 QString SoftKeyboardField::newText(const QString& title, const QString& text)
 {
-    return FieldName::write(fieldData(title, text, NewTextKeyboard));
+    return FieldName::write(fieldData(title, text, NEW_TEXT_KEYBOARD));
 }
 
 QString SoftKeyboardField::doubleClick(const QString& title, const QString& text)
 {
-    return FieldName::write(fieldData(title, text, EditKeyboard));
+    return FieldName::write(fieldData(title, text, EDIT_KEYBOARD));
 }
 
 QString SoftKeyboardField::commonState(const QString& title, const QString& text, const GraphicsText& item)
 {
-    SubCommonDefine::tagSoftKeyBoardInitData data = fieldData(title, text, EditKeyboard);
+    SubCommonDefine::tagSoftKeyBoardInitData data = fieldData(title, text, EDIT_KEYBOARD);
     data.textLength = item.textCursor().position();
     data.selectionStart = getCursorSelectionStartPosition(item);
     data.selectionEnd = item.textCursor().position();

@@ -13,11 +13,11 @@ namespace
 {
 
 // Positions beyond this come from damaged files; a scene index cannot hold them.
-constexpr float PlaceLimit = 100000.0F;
+constexpr float PLACE_LIMIT = 100000.0F;
 
 float usablePlace(float value)
 {
-    return std::isfinite(value) ? std::clamp(value, -PlaceLimit, PlaceLimit) : 0.0F;
+    return std::isfinite(value) ? std::clamp(value, -PLACE_LIMIT, PLACE_LIMIT) : 0.0F;
 }
 
 bool sameStyle(const TextStyle& a, const TextStyle& b)

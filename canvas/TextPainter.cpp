@@ -19,13 +19,13 @@ using namespace TextObjectConstants;
 namespace
 {
 // Position of the baseline within the height of a line.
-constexpr double BaselineShare = 0.85;
-constexpr double CaretShift = 1.0;
-constexpr double FrameRadius = 1.0;
+constexpr double BASELINE_SHARE = 0.85;
+constexpr double CARET_SHIFT = 1.0;
+constexpr double FRAME_RADIUS = 1.0;
 // Pixels; the font system caches bitmaps of smaller characters.
-constexpr int LargestBitmapGlyph = 64;
-const QColor SelectedFill(0, 128, 255, 77);
-const QColor EditFill(0, 0, 0, 77);
+constexpr int LARGEST_BITMAP_GLYPH = 64;
+const QColor SELECTED_FILL(0, 128, 255, 77);
+const QColor EDIT_FILL(0, 0, 0, 77);
 
 // Returns the visible area of the painter's device, in the painter's coordinates.
 QRectF visibleArea(const QPainter& painter)
@@ -68,7 +68,7 @@ void TextPainter::addGlyph(int position, const QString& text, const CaretGeometr
     const QFont font = CharacterFormat::font(*style, m_ratio);
     Glyph glyph;
     glyph.path = GlyphPathCache::glyph(font, text);
-    glyph.baseline = QPointF(caret.x - CaretShift, caret.top + BaselineShare * caret.height);
+    glyph.baseline = QPointF(caret.x - CARET_SHIFT, caret.top + BASELINE_SHARE * caret.height);
     glyph.color = CharacterFormat::color(style->getFontColor());
     glyph.color.setAlpha(255);
     glyph.edge = style->isTextEdge() != 0 && glyph.path->hasPath();
@@ -81,7 +81,7 @@ void TextPainter::addGlyph(int position, const QString& text, const CaretGeometr
     const QRectF reach(glyph.baseline - QPointF(extent, extent), QSizeF(2.0 * extent, 2.0 * extent));
     // A glyph with an outline is drawn as a path, so that both fit exactly. Other small characters look best
     // when the font system draws them.
-    if (!glyph.path->hasPath() || (!glyph.edge && font.pixelSize() < LargestBitmapGlyph)) {
+    if (!glyph.path->hasPath() || (!glyph.edge && font.pixelSize() < LARGEST_BITMAP_GLYPH)) {
         addRuns(glyph, reach);
         return;
     }
@@ -198,7 +198,7 @@ void TextPainter::drawItemBoundingRect(QPainter* painter, const QRectF& rect, in
 {
     prepareFrame(rect);
     painter->setRenderHint(QPainter::Antialiasing, false);
-    painter->fillRect(m_frame.rect, status == FocusObject ? SelectedFill : EditFill);
+    painter->fillRect(m_frame.rect, status == FocusObject ? SELECTED_FILL : EDIT_FILL);
     painter->setRenderHint(QPainter::Antialiasing);
     if (status == FocusObject) {
         painter->fillPath(m_frame.solid, QColor(ITEMBOUNDINGSOLIDCOLOR));
@@ -216,7 +216,7 @@ void TextPainter::prepareFrame(const QRectF& rect)
     if (m_frame.rect == rect)
         return;
     QPainterPath outline;
-    outline.addRoundedRect(rect, FrameRadius, FrameRadius);
+    outline.addRoundedRect(rect, FRAME_RADIUS, FRAME_RADIUS);
     m_frame.rect = rect;
     m_frame.solid = QPainterPathStroker(QPen(Qt::black, ITEMBOUNDINGWIDTH)).createStroke(outline);
     m_frame.solid.setFillRule(Qt::WindingFill);

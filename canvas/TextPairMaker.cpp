@@ -13,7 +13,7 @@ namespace
 {
 
 // More steps than any number of objects can require.
-constexpr int MaximumCascade = 1000;
+constexpr int MAXIMUM_CASCADE = 1000;
 
 } // namespace
 
@@ -73,7 +73,7 @@ GraphicsText* TextPairMaker::makeNew(int id, QPointF place, int z, NewTextStyle&
 QPointF TextPairMaker::getInitItemScenePosition() const
 {
     QPointF place = m_scene.sceneRect().center();
-    for (int i = 0; i < MaximumCascade; ++i) {
+    for (int i = 0; i < MAXIMUM_CASCADE; ++i) {
         const QGraphicsItem* under = m_scene.itemAt(place, QTransform());
         if (!under || under->type() != GraphicsText::Type)
             break;

@@ -10,8 +10,8 @@ namespace
 {
 
 // How far the finger moves beyond the limits on the left and at the top before the object follows it.
-constexpr double LeftReturnFactor = 2.0;
-constexpr double TopReturnFactor = 3.0;
+constexpr double LEFT_RETURN_FACTOR = 2.0;
+constexpr double TOP_RETURN_FACTOR = 3.0;
 
 } // namespace
 
@@ -48,14 +48,14 @@ QPointF TextPlacement::adjustItemPos(Side side)
     switch (side) {
     case LeftSide:
         placed.setX(SCENE_RECT.left() - (size.width() - LIMITEDNUM));
-        reach.setX(LeftReturnFactor * (size.width() - LIMITEDNUM));
+        reach.setX(LEFT_RETURN_FACTOR * (size.width() - LIMITEDNUM));
         break;
     case RightSide:
         placed.setX(SCENE_RECT.width() - LIMITEDNUM);
         break;
     case TopSide:
         placed.setY(SCENE_RECT.top() - (size.height() - LIMITEDNUM));
-        reach.setY(TopReturnFactor * (size.height() - LIMITEDNUM));
+        reach.setY(TOP_RETURN_FACTOR * (size.height() - LIMITEDNUM));
         break;
     case BottomSide:
         placed.setY(SCENE_RECT.height() - LIMITEDNUM);

@@ -11,7 +11,7 @@ namespace
 {
 
 // Pixels; twice the canvas. Most of a larger object is outside the view.
-constexpr qint64 LargestPicture = 2LL * 1480 * 920;
+constexpr qint64 LARGEST_PICTURE = 2LL * 1480 * 920;
 
 } // namespace
 
@@ -40,7 +40,7 @@ void TextShadowEffect::drawPicture(const QPainter& painter, QRect area)
 void TextShadowEffect::draw(QPainter* painter)
 {
     const QRect area = boundingRectFor(sourceBoundingRect(Qt::DeviceCoordinates)).toAlignedRect();
-    if (!isWorthKeeping(*painter) || qint64(area.width()) * area.height() > LargestPicture) {
+    if (!isWorthKeeping(*painter) || qint64(area.width()) * area.height() > LARGEST_PICTURE) {
         m_picture = QPixmap();
         QGraphicsDropShadowEffect::draw(painter);
         return;

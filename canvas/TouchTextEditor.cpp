@@ -24,8 +24,8 @@ namespace
 {
 
 // Pixels around the picture of a handle that still count as the handle.
-constexpr double HandleTolerance = 8.0;
-constexpr double CaretShift = 1.0;
+constexpr double HANDLE_TOLERANCE = 8.0;
+constexpr double CARET_SHIFT = 1.0;
 
 bool isMouseEvent(QEvent::Type type)
 {
@@ -91,7 +91,7 @@ void TouchTextEditor::mousePress(QGraphicsSceneMouseEvent* event)
 bool TouchTextEditor::handleIsHit(const TouchState::End& end, QPointF point)
 {
     const QRectF picture(end.point, QSizeF(HANDLEPIXMAPWIDTH, HANDLEPIXMAPHEIGHT));
-    return picture.adjusted(-HandleTolerance, -HandleTolerance, HandleTolerance, HandleTolerance)
+    return picture.adjusted(-HANDLE_TOLERANCE, -HANDLE_TOLERANCE, HANDLE_TOLERANCE, HANDLE_TOLERANCE)
         .contains(point);
 }
 
@@ -396,7 +396,7 @@ void TouchTextEditor::getPressedPos(QPointF point)
     for (int i = 1; !below && i < measured.layout()->lineCount() && line.y() + line.height() < inside; ++i)
         line = measured.layout()->lineAt(i);
     // xToCursor() subtracts the left offset of the line itself.
-    putCursor(tapped.position() + line.xToCursor(point.x() - m_document.documentMargin() - CaretShift));
+    putCursor(tapped.position() + line.xToCursor(point.x() - m_document.documentMargin() - CARET_SHIFT));
 }
 
 bool TouchTextEditor::wholeTextSelected() const

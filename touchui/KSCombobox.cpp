@@ -144,7 +144,7 @@ void KSCombobox::setUSBEnabled(bool enabled)
     }
     for (int row = 0; row < items->rowCount(); ++row) {
         QStandardItem* item = items->item(row);
-        if (item != nullptr && item->data(USBRole).toBool()) {
+        if (item != nullptr && item->data(USB_ROLE).toBool()) {
             item->setEnabled(enabled);
         }
     }
@@ -334,7 +334,7 @@ void KSCombobox::drawPopListTranslucent(QWidget* popup)
 
 bool KSCombobox::event(QEvent* event)
 {
-    if (event->type() == QEvent::Type(KSEventProcessLockObject::RestoreOriginalType)) {
+    if (event->type() == QEvent::Type(KSEventProcessLockObject::RESTORE_ORIGINAL_TYPE)) {
         hidePopup();
         return true;
     }

@@ -21,7 +21,7 @@ class KSCombobox : public QComboBox
     Q_OBJECT
 public:
     // Set to true for rows that setUSBEnabled enables and disables.
-    static constexpr int USBRole = Qt::UserRole + 100;
+    static constexpr int USB_ROLE = Qt::UserRole + 100;
 
     explicit KSCombobox(QWidget* parent = nullptr);
     ~KSCombobox() override;
@@ -38,7 +38,7 @@ public:
     void setPopupUpper(bool upper) { m_popupUpper = upper; }
     // Shows colours in the rows and in the box, see CustomComboBoxDelegate.
     void setColorPallete(bool on);
-    // Enables or disables the rows with USBRole.
+    // Enables or disables the rows with USB_ROLE.
     void setUSBEnabled(bool enabled);
     // Sets the pictures of the closed box: path + "_Left", "_Center", "_Pulldown", and the same with
     // "_Pressed" and "_Disable".

@@ -104,7 +104,7 @@ void KSEventProcessLockObject::slotRestoreOriginal()
 void KSEventProcessLockObject::slotRestoreAll()
 {
     if (m_object != nullptr) {
-        QEvent event(static_cast<QEvent::Type>(RestoreOriginalType));
+        QEvent event(static_cast<QEvent::Type>(RESTORE_ORIGINAL_TYPE));
         QCoreApplication::sendEvent(m_object, &event);
     }
 }

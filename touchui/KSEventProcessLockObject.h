@@ -33,7 +33,7 @@ public:
 
     // Type of the event that is sent to the remembered object when another process asks this one to close its
     // transient controls.
-    static constexpr int RestoreOriginalType = 1001;
+    static constexpr int RESTORE_ORIGINAL_TYPE = 1001;
     static KSEventProcessLockObject* s_instance;
 
 public Q_SLOTS:

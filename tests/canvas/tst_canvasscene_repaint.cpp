@@ -10,7 +10,7 @@ namespace
 {
 
 // More than an operator's minute of a blinking caret.
-constexpr int Rounds = 200;
+constexpr int ROUNDS = 200;
 
 class PaintCounter : public QObject
 {
@@ -146,7 +146,7 @@ void tst_canvasscene_repaint::idle()
     bring(state);
     int fired = 0;
     const int paints = paintsOf([&] {
-        for (int i = 0; i < Rounds; ++i) {
+        for (int i = 0; i < ROUNDS; ++i) {
             fired += fireTimers(m_canvas->text(1));
             QCoreApplication::sendPostedEvents();
         }

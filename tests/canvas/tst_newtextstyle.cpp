@@ -23,8 +23,8 @@ private Q_SLOTS:
 namespace
 {
 
-constexpr int Japanese = 2; // row of the font tables
-const QString FamilyOfModel = QStringLiteral("DFHeiW5-A");
+constexpr int JAPANESE = 2; // row of the font tables
+const QString FAMILY_OF_MODEL = QStringLiteral("DFHeiW5-A");
 
 FontStyle rememberedStyle()
 {
@@ -67,9 +67,9 @@ void tst_newtextstyle::family_data()
     const QString none;
     const QString japanese = QStringLiteral("KST Japanese Pro");
     QTest::newRow("remembered") << false << false << none << "Remembered" << 2;
-    QTest::newRow("of the model") << true << false << none << FamilyOfModel << 0;
+    QTest::newRow("of the model") << true << false << none << FAMILY_OF_MODEL << 0;
     QTest::newRow("of a new language") << false << true << none << japanese << 1;
-    QTest::newRow("of model before language") << true << true << none << FamilyOfModel << 0;
+    QTest::newRow("of model before language") << true << true << none << FAMILY_OF_MODEL << 0;
     QTest::newRow("of the panel") << false << false << "Shown"
                                   << "Shown" << 2;
     QTest::newRow("of the panel before the model") << true << false << "Shown"
@@ -89,9 +89,9 @@ void tst_newtextstyle::family()
     QFETCH(int, ensureMode);
     NewTextStyle style(QStringLiteral("ab"), rememberedStyle());
     if (model)
-        style.setFamilyOfModel(FamilyOfModel);
+        style.setFamilyOfModel(FAMILY_OF_MODEL);
     if (newLanguage)
-        style.setLanguageRow(Japanese);
+        style.setLanguageRow(JAPANESE);
     style.askPanel();
     if (!panel.isEmpty())
         style.rememberProperty(shown(panel.toUtf8().constData()));
@@ -106,9 +106,9 @@ void tst_newtextstyle::family()
 void tst_newtextstyle::aNewLanguageCountsOnce()
 {
     NewTextStyle style(QStringLiteral("ab"), rememberedStyle());
-    style.setLanguageRow(Japanese);
-    style.setLanguageRow(Japanese);
-    QCOMPARE(style.languageRow(), Japanese);
+    style.setLanguageRow(JAPANESE);
+    style.setLanguageRow(JAPANESE);
+    QCOMPARE(style.languageRow(), JAPANESE);
     QCOMPARE(style.firstCharacter().ensureMode, 1);
     QCOMPARE(style.firstCharacter().ensureMode, 2);
     style.setLanguageRow(0);
@@ -119,7 +119,7 @@ void tst_newtextstyle::aNewLanguageCountsOnce()
 void tst_newtextstyle::aChosenFamilyEndsThatOfTheModel()
 {
     NewTextStyle style(QStringLiteral("ab"), rememberedStyle());
-    style.setFamilyOfModel(FamilyOfModel);
+    style.setFamilyOfModel(FAMILY_OF_MODEL);
     style.propertyChanged(TextObjectConstants::PropertySize);
     QCOMPARE(style.firstCharacter().ensureMode, 0);
     style.propertyChanged(TextObjectConstants::PropertyFamily);

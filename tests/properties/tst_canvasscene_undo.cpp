@@ -30,20 +30,20 @@ namespace
 {
 
 #ifdef __SANITIZE_ADDRESS__
-constexpr int DefaultEdits = 1000;
+constexpr int DEFAULT_EDITS = 1000;
 #else
-constexpr int DefaultEdits = 10000;
+constexpr int DEFAULT_EDITS = 10000;
 #endif
-constexpr int DefaultSeed = 20231;
+constexpr int DEFAULT_SEED = 20231;
 // As in the window.
-constexpr int WindowUndoLimit = 25;
-constexpr int FocusCommandId = 1;
+constexpr int WINDOW_UNDO_LIMIT = 25;
+constexpr int FOCUS_COMMAND_ID = 1;
 
 // What the window pushes when another title is selected.
 class FocusCommand : public QUndoCommand
 {
 public:
-    int id() const override { return FocusCommandId; }
+    int id() const override { return FOCUS_COMMAND_ID; }
 };
 
 // The objects shown, by their ids: one that undo has brought back stands last in the list of texts and in the
@@ -105,7 +105,7 @@ QImage pictureOf(const Canvas& canvas)
 // Pixels that differ by more than the rounding of a place allows.
 int differingPixels(const QImage& a, const QImage& b)
 {
-    constexpr int Rounding = 8;
+    constexpr int ROUNDING = 8;
     int differing = 0;
     for (int y = 0; y < a.height(); ++y) {
         const auto* p = reinterpret_cast<const QRgb*>(a.constScanLine(y));
@@ -113,8 +113,8 @@ int differingPixels(const QImage& a, const QImage& b)
         for (int x = 0; x < a.width(); ++x) {
             differing +=
                 p[x] != q[x] &&
-                (qAbs(qRed(p[x]) - qRed(q[x])) > Rounding || qAbs(qGreen(p[x]) - qGreen(q[x])) > Rounding ||
-                 qAbs(qBlue(p[x]) - qBlue(q[x])) > Rounding || qAbs(qAlpha(p[x]) - qAlpha(q[x])) > Rounding);
+                (qAbs(qRed(p[x]) - qRed(q[x])) > ROUNDING || qAbs(qGreen(p[x]) - qGreen(q[x])) > ROUNDING ||
+                 qAbs(qBlue(p[x]) - qBlue(q[x])) > ROUNDING || qAbs(qAlpha(p[x]) - qAlpha(q[x])) > ROUNDING);
         }
     }
     return differing;
@@ -319,8 +319,8 @@ void ignoreDebug(QtMsgType type, const QMessageLogContext&, const QString& text)
 void tst_canvasscene_undo::initTestCase()
 {
     qRegisterMetaType<TText*>("TText*");
-    m_edits = runLength("TITLER_EDITS", DefaultEdits);
-    qInfo("seed %u, %d edits", quint32(RandomSeed(DefaultSeed)), m_edits);
+    m_edits = runLength("TITLER_EDITS", DEFAULT_EDITS);
+    qInfo("seed %u, %d edits", quint32(RandomSeed(DEFAULT_SEED)), m_edits);
     // Every step saves the title; in memory that does not wait for a disk.
     if (QFileInfo(QStringLiteral("/dev/shm")).isWritable())
         qputenv("TMPDIR", "/dev/shm");
@@ -350,7 +350,7 @@ void tst_canvasscene_undo::undoAllRedoAll()
     canvas.open(someTexts());
     canvas.scene->saveArchive();
     History history(canvas);
-    const RandomSeed seed(DefaultSeed);
+    const RandomSeed seed(DEFAULT_SEED);
     RandomEditor operator_(canvas, seed, 16);
     const End start(canvas);
     for (int i = 0; i < m_edits; ++i) {
@@ -390,11 +390,11 @@ void tst_canvasscene_undo::undoAllRedoAll()
 void tst_canvasscene_undo::shortHistory()
 {
     Canvas canvas;
-    canvas.stack.setUndoLimit(WindowUndoLimit);
+    canvas.stack.setUndoLimit(WINDOW_UNDO_LIMIT);
     canvas.open(someTexts());
     canvas.scene->saveArchive();
     History history(canvas);
-    const RandomSeed seed(DefaultSeed);
+    const RandomSeed seed(DEFAULT_SEED);
     RandomEditor operator_(canvas, seed + 1, 60);
     const int rounds = qMax(1, m_edits / 100);
     for (int round = 0; round < rounds; ++round) {
@@ -403,8 +403,8 @@ void tst_canvasscene_undo::shortHistory()
             history.edited();
         }
         operator_.leave();
-        QVERIFY(canvas.stack.count() <= WindowUndoLimit);
-        const int back = operator_.below(WindowUndoLimit + 3);
+        QVERIFY(canvas.stack.count() <= WINDOW_UNDO_LIMIT);
+        const int back = operator_.below(WINDOW_UNDO_LIMIT + 3);
         const int forth = operator_.below(back + 1);
         for (int i = 0; i < back && canvas.stack.canUndo(); ++i) {
             history.undo();
@@ -431,17 +431,17 @@ void tst_canvasscene_undo::shortHistory()
 void tst_canvasscene_undo::focusCommandsOnACleanStack()
 {
     Canvas canvas;
-    canvas.stack.setUndoLimit(WindowUndoLimit);
+    canvas.stack.setUndoLimit(WINDOW_UNDO_LIMIT);
     canvas.open(someTexts());
     canvas.scene->saveArchive();
     const auto push = [&canvas](QUndoCommand* command) {
-        if (canvas.stack.isClean() && command->id() == FocusCommandId)
+        if (canvas.stack.isClean() && command->id() == FOCUS_COMMAND_ID)
             delete command;
         else
             canvas.stack.push(command);
     };
     History history(canvas);
-    const RandomSeed seed(DefaultSeed);
+    const RandomSeed seed(DEFAULT_SEED);
     RandomEditor operator_(canvas, seed + 2, 16);
     QList<int> ids;
     connect(canvas.scene.get(), &CanvasScene::signalPushUndoCommandIntoStack, this,
@@ -449,7 +449,7 @@ void tst_canvasscene_undo::focusCommandsOnACleanStack()
     push(new FocusCommand);
     QCOMPARE(canvas.stack.count(), 0);
     const End start(canvas);
-    while (canvas.stack.count() < WindowUndoLimit - 1) {
+    while (canvas.stack.count() < WINDOW_UNDO_LIMIT - 1) {
         operator_.edit();
         operator_.leave();
         history.edited();
@@ -476,7 +476,7 @@ void tst_canvasscene_undo::focusCommandsOnACleanStack()
     QVERIFY(ids.size() >= steps);
     QCOMPARE(ids.count(-1), ids.size());
     push(new FocusCommand);
-    QCOMPARE(canvas.stack.count(), qMin(steps + 1, WindowUndoLimit));
+    QCOMPARE(canvas.stack.count(), qMin(steps + 1, WINDOW_UNDO_LIMIT));
 }
 
 QTEST_MAIN(tst_canvasscene_undo)

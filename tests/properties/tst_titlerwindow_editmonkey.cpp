@@ -27,17 +27,17 @@ namespace
 {
 
 #ifdef __SANITIZE_ADDRESS__
-constexpr int DefaultTouches = 1000;
+constexpr int DEFAULT_TOUCHES = 1000;
 #else
-constexpr int DefaultTouches = 10000;
+constexpr int DEFAULT_TOUCHES = 10000;
 #endif
-constexpr int ReplayedTouches = 2000;
-constexpr int DefaultSeed = 20231;
-constexpr int TouchesPerLook = 1000;
-constexpr int TouchesPerFrame = 50;
-constexpr int ReplayTimeout = 60000;
+constexpr int REPLAYED_TOUCHES = 2000;
+constexpr int DEFAULT_SEED = 20231;
+constexpr int TOUCHES_PER_LOOK = 1000;
+constexpr int TOUCHES_PER_FRAME = 50;
+constexpr int REPLAY_TIMEOUT = 60000;
 // Set in a process that only runs the monkey and writes there what the title became.
-constexpr char DigestVariable[] = "TITLER_MONKEY_DIGEST";
+constexpr char DIGEST_VARIABLE[] = "TITLER_MONKEY_DIGEST";
 
 QString describe(const std::vector<TText*>& texts)
 {
@@ -105,8 +105,8 @@ private:
 
 void tst_titlerwindow_editmonkey::initTestCase()
 {
-    mTouches = runLength("TITLER_TOUCHES", DefaultTouches);
-    qInfo("seed %u, %d touches", quint32(RandomSeed(DefaultSeed)), mTouches);
+    mTouches = runLength("TITLER_TOUCHES", DEFAULT_TOUCHES);
+    qInfo("seed %u, %d touches", quint32(RandomSeed(DEFAULT_SEED)), mTouches);
     MonkeyGround::showErrorsOnly();
     QVERIFY(mSiblings.listenOnFreePorts());
     mWindow = makeWaitingWindow();
@@ -180,7 +180,7 @@ void tst_titlerwindow_editmonkey::manyTouches()
     QElapsedTimer clock;
     clock.start();
 
-    const RandomSeed seed(DefaultSeed);
+    const RandomSeed seed(DEFAULT_SEED);
     CanvasFingers fingers(*mWindow, mDevice, seed);
     for (int steps = 1; fingers.touches() < mTouches; ++steps) {
         fingers.act();
@@ -190,9 +190,9 @@ void tst_titlerwindow_editmonkey::manyTouches()
             QVERIFY2(heldLocks().isEmpty(),
                      qPrintable(heldLocks() + "\n" + fingers.lastTouches().join('\n')));
         }
-        if (steps % TouchesPerFrame == 0)
+        if (steps % TOUCHES_PER_FRAME == 0)
             QCoreApplication::processEvents();
-        if (steps % TouchesPerLook != 0)
+        if (steps % TOUCHES_PER_LOOK != 0)
             continue;
         look(fingers.touches());
         if (QTest::currentTestFailed())
@@ -218,7 +218,7 @@ void tst_titlerwindow_editmonkey::manyTouches()
     Archive saved;
     QCOMPARE(TitleParser().readOneTitle(path.toStdString(), &saved), 1);
     QCOMPARE(difference(describe(saved.text()), describe(shown)), QString());
-    if (const QString digest = qEnvironmentVariable(DigestVariable); !digest.isEmpty()) {
+    if (const QString digest = qEnvironmentVariable(DIGEST_VARIABLE); !digest.isEmpty()) {
         QFile file(digest);
         QVERIFY(file.open(QIODevice::WriteOnly));
         file.write(describe(shown).toUtf8());
@@ -246,12 +246,12 @@ QByteArray tst_titlerwindow_editmonkey::replay(const QString& name)
     QProcessEnvironment environment = QProcessEnvironment::systemEnvironment();
     QDir(mData.path()).mkpath(name);
     environment.insert(QStringLiteral("XDG_DATA_HOME"), mData.filePath(name));
-    environment.insert(QStringLiteral("TITLER_SEED"), QString::number(quint32(RandomSeed(DefaultSeed))));
-    environment.insert(QStringLiteral("TITLER_TOUCHES"), QString::number(ReplayedTouches));
-    environment.insert(QString::fromLatin1(DigestVariable), mData.filePath(name + ".txt"));
+    environment.insert(QStringLiteral("TITLER_SEED"), QString::number(quint32(RandomSeed(DEFAULT_SEED))));
+    environment.insert(QStringLiteral("TITLER_TOUCHES"), QString::number(REPLAYED_TOUCHES));
+    environment.insert(QString::fromLatin1(DIGEST_VARIABLE), mData.filePath(name + ".txt"));
     process.setProcessEnvironment(environment);
     process.start(QCoreApplication::applicationFilePath(), {QStringLiteral("manyTouches")});
-    if (!process.waitForFinished(ReplayTimeout) || process.exitCode() != 0)
+    if (!process.waitForFinished(REPLAY_TIMEOUT) || process.exitCode() != 0)
         return process.readAllStandardOutput();
     return bytesOf(mData.filePath(name + ".txt"));
 }

@@ -35,60 +35,60 @@ namespace
 {
 
 #ifdef __SANITIZE_ADDRESS__
-constexpr int DefaultTouches = 1000;
+constexpr int DEFAULT_TOUCHES = 1000;
 #else
-constexpr int DefaultTouches = 5000;
+constexpr int DEFAULT_TOUCHES = 5000;
 #endif
-constexpr int TouchesForAll = 5000; // from which on everything must happen
-constexpr int MostRounds = 4;       // as often as that many touches
-constexpr int DefaultSeed = 20261;
-constexpr int TouchesPerFrame = 16;
-constexpr int TouchesPerGlance = 40; // at what is shown
-constexpr int TouchesPerLook = 1000; // at what is on disk
-constexpr int LooksPerPicture = 5;   // read the pictures, too
+constexpr int TOUCHES_FOR_ALL = 5000; // from which on everything must happen
+constexpr int MOST_ROUNDS = 4;       // as often as that many touches
+constexpr int DEFAULT_SEED = 20261;
+constexpr int TOUCHES_PER_FRAME = 16;
+constexpr int TOUCHES_PER_GLANCE = 40; // at what is shown
+constexpr int TOUCHES_PER_LOOK = 1000; // at what is on disk
+constexpr int LOOKS_PER_PICTURE = 5;   // read the pictures, too
 
-const char* const MustHappen[] = {"titles made",
-                                  "titles pasted",
-                                  "titles deleted",
-                                  "titles moved",
-                                  "titles focused",
-                                  "templates saved",
-                                  "templates deleted by the operator",
-                                  "templates imported",
-                                  "templates renamed by the file manager",
-                                  "templates deleted by the file manager",
-                                  "folders made",
-                                  "folders renamed",
-                                  "folders duplicated",
-                                  "folders opened",
-                                  "folders renamed by the file manager",
-                                  "folders deleted by the file manager",
-                                  "undo",
-                                  "redo",
-                                  "closes",
-                                  "answers to the asker",
-                                  "requests to create",
-                                  "requests to edit a folder",
-                                  "requests to edit a title",
-                                  "requests without a path",
-                                  "requests for what is not there",
-                                  "requests of the sub panel",
-                                  "lines typed on the keyboard",
-                                  "texts typed on the keyboard",
-                                  "keyboards put away",
-                                  "languages changed",
-                                  "masks shown",
-                                  "presses in other processes",
-                                  "boxes answered OK",
-                                  "boxes answered Cancel",
-                                  "message 43",
-                                  "message 47",
-                                  "message 112",
-                                  "message 117",
-                                  "FolderPicker shown",
-                                  "TemplatePicker shown",
-                                  "ArchiveMenu shown",
-                                  "ColorPalette shown"};
+const char* const MUST_HAPPEN[] = {"titles made",
+                                   "titles pasted",
+                                   "titles deleted",
+                                   "titles moved",
+                                   "titles focused",
+                                   "templates saved",
+                                   "templates deleted by the operator",
+                                   "templates imported",
+                                   "templates renamed by the file manager",
+                                   "templates deleted by the file manager",
+                                   "folders made",
+                                   "folders renamed",
+                                   "folders duplicated",
+                                   "folders opened",
+                                   "folders renamed by the file manager",
+                                   "folders deleted by the file manager",
+                                   "undo",
+                                   "redo",
+                                   "closes",
+                                   "answers to the asker",
+                                   "requests to create",
+                                   "requests to edit a folder",
+                                   "requests to edit a title",
+                                   "requests without a path",
+                                   "requests for what is not there",
+                                   "requests of the sub panel",
+                                   "lines typed on the keyboard",
+                                   "texts typed on the keyboard",
+                                   "keyboards put away",
+                                   "languages changed",
+                                   "masks shown",
+                                   "presses in other processes",
+                                   "boxes answered OK",
+                                   "boxes answered Cancel",
+                                   "message 43",
+                                   "message 47",
+                                   "message 112",
+                                   "message 117",
+                                   "FolderPicker shown",
+                                   "TemplatePicker shown",
+                                   "ArchiveMenu shown",
+                                   "ColorPalette shown"};
 
 } // namespace
 
@@ -150,8 +150,8 @@ private:
 
 void tst_titlerwindow_monkey::initTestCase()
 {
-    mSeed = RandomSeed(DefaultSeed);
-    mTouches = runLength("TITLER_TOUCHES", DefaultTouches);
+    mSeed = RandomSeed(DEFAULT_SEED);
+    mTouches = runLength("TITLER_TOUCHES", DEFAULT_TOUCHES);
     qInfo("seed %u, %d touches", mSeed, mTouches);
     MonkeyGround::showErrorsOnly();
     QLoggingCategory::setFilterRules(QStringLiteral("*.debug=false"));
@@ -268,13 +268,13 @@ bool tst_titlerwindow_monkey::isEnough() const
 {
     const int touches = mFingers->touches();
     return touches >= mTouches &&
-           (mTouches < TouchesForAll || touches >= mTouches * MostRounds || missed().isEmpty());
+           (mTouches < TOUCHES_FOR_ALL || touches >= mTouches * MOST_ROUNDS || missed().isEmpty());
 }
 
 QStringList tst_titlerwindow_monkey::missed() const
 {
     QStringList missed;
-    for (const char* what : MustHappen) {
+    for (const char* what : MUST_HAPPEN) {
         if (mCounts.value(QLatin1String(what)) == 0)
             missed.append(QLatin1String(what));
     }
@@ -283,7 +283,7 @@ QStringList tst_titlerwindow_monkey::missed() const
 
 void tst_titlerwindow_monkey::play()
 {
-    for (int i = 0; i < TouchesPerFrame && mFailure.isEmpty(); ++i) {
+    for (int i = 0; i < TOUCHES_PER_FRAME && mFailure.isEmpty(); ++i) {
         const QWidget* dialog = QApplication::activeModalWidget();
         const bool isHidden = mWindow->isHidden();
         mFingers->step();
@@ -294,13 +294,13 @@ void tst_titlerwindow_monkey::play()
                 return fail(held);
         }
         if (mFingers->touches() >= mNextGlance) {
-            mNextGlance = mFingers->touches() + TouchesPerGlance;
+            mNextGlance = mFingers->touches() + TOUCHES_PER_GLANCE;
             if (const QString wrong = glance(); !wrong.isEmpty())
                 return fail(wrong);
         }
         if (mFingers->touches() >= mNextLook) {
-            mNextLook = mFingers->touches() + TouchesPerLook;
-            if (const QString wrong = lookAtDisk(++mLooks % LooksPerPicture == 0); !wrong.isEmpty())
+            mNextLook = mFingers->touches() + TOUCHES_PER_LOOK;
+            if (const QString wrong = lookAtDisk(++mLooks % LOOKS_PER_PICTURE == 0); !wrong.isEmpty())
                 return fail(wrong);
         }
         // A dialog that has closed must get its turn to end.
@@ -419,7 +419,7 @@ void tst_titlerwindow_monkey::manyTouches()
     QVERIFY(FileSyncQueue::flush(std::chrono::seconds(60)));
     const QString wrong = lookAtDisk(true);
     QVERIFY2(wrong.isEmpty(), qPrintable(wrong));
-    if (mTouches >= TouchesForAll)
+    if (mTouches >= TOUCHES_FOR_ALL)
         QCOMPARE(missed().join(", "), QString());
 }
 

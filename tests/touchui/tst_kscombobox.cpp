@@ -227,7 +227,7 @@ void tst_kscombobox::disabledRowKeepsTheListOpen()
 
 void tst_kscombobox::switchedRows()
 {
-    m_box->setItemData(2, true, KSCombobox::USBRole);
+    m_box->setItemData(2, true, KSCombobox::USB_ROLE);
     m_box->setUSBEnabled(false);
     QVERIFY(!(m_box->model()->index(2, 0).flags() & Qt::ItemIsEnabled));
     QVERIFY(m_box->model()->index(1, 0).flags() & Qt::ItemIsEnabled);
