@@ -18,6 +18,7 @@ public:
     virtual void setTarget(void* target) = 0;
 };
 
+// An adapter that makes proxies for the callbacks that peers register.
 class IAdapter : public IAdapterBase
 {
 public:

@@ -17,6 +17,7 @@ public:
     virtual void setSender(ISender* sender) = 0;
 };
 
+// A proxy that registers callbacks: it makes their adapters and has them served by a receiver.
 class IProxy : public IProxyBase
 {
 public:

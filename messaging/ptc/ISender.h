@@ -26,6 +26,7 @@ public:
     virtual void finish(std::chrono::steady_clock::time_point) {}
 };
 
+// A sender that has a connection to another process.
 class IRemoteSender : public ISender
 {
 public:

@@ -42,6 +42,7 @@ public:
     int closed = 0;
 };
 
+// Counts the closings of the soft keyboard.
 class ClosingEdit : public QLineEdit
 {
 public:
@@ -58,6 +59,7 @@ public:
     bool closedWasSeen = false;
 };
 
+// Keeps the texts that it was asked for.
 class RecordingValidator : public QRegularExpressionValidator
 {
 public:

@@ -39,6 +39,7 @@ public:
     }
 };
 
+// A source whose editors end themselves.
 class SelfEndingSource : public TreeSource
 {
 public:
