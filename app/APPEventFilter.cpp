@@ -19,12 +19,10 @@ APPEventFilter* APPEventFilter::instance()
 
 void APPEventFilter::release()
 {
-    if (mInstance == nullptr) {
+    if (mInstance == nullptr)
         return;
-    }
-    if (QCoreApplication::instance() != nullptr) {
+    if (QCoreApplication::instance() != nullptr)
         QCoreApplication::instance()->removeEventFilter(mInstance);
-    }
     delete mInstance;
     mInstance = nullptr;
 }
@@ -63,13 +61,11 @@ KSLockObject* APPEventFilter::createLockObject(QObject* obj, KSLockObject* lock,
 KSLockObject* APPEventFilter::registerLockObject(QObject* obj, KSLockObject* lock, LOCKOBJECT_TYPE type,
                                                  void* param)
 {
-    if (type != LOCKOBJECT_PROCESS) {
+    if (type != LOCKOBJECT_PROCESS)
         return KSAppEventFilter::registerLockObject(obj, lock, type, param);
-    }
     KSLockObject* process = processLock();
     keepNewLockObject(process);
-    if (initLockObject(obj, process, type, param) == 0) {
+    if (initLockObject(obj, process, type, param) == 0)
         addRegLockObject(obj, process, type, param);
-    }
     return process;
 }

@@ -68,10 +68,9 @@ PTC::ISender* TitlerToolFactory::serviceSender(long client, long port)
 std::vector<long> TitlerToolFactory::missingSiblings()
 {
     std::map<long, long, std::greater<>> ports;
-    for (const ServiceTable::Service& service : ServiceTable::services()) {
+    for (const ServiceTable::Service& service : ServiceTable::services())
         if (!findSender(service.clientKey))
             ports[service.clientKey] = service.port;
-    }
     std::vector<long> missing;
     for (const auto& [key, port] : ports)
         missing.push_back(port);

@@ -71,10 +71,9 @@ constexpr int CANVAS_CHECKER = 2;
 bool isGraphicsView(const QWidget* widget)
 {
     // The widget may be the viewport of the view.
-    for (; widget; widget = widget->parentWidget()) {
+    for (; widget; widget = widget->parentWidget())
         if (qobject_cast<const QGraphicsView*>(widget))
             return true;
-    }
     return false;
 }
 

@@ -59,9 +59,8 @@ ToolsBar::ToolsBar(QAction* undo, QAction* redo, QWidget* parent)
     createConnection();
     translateText();
     resetToDefaultState();
-    if (APPEventFilter* filter = APPEventFilter::instance()) {
+    if (APPEventFilter* filter = APPEventFilter::instance())
         filter->registerEventFilter(this);
-    }
 }
 
 ToolsBar::~ToolsBar() = default;
@@ -107,9 +106,8 @@ void ToolsBar::createMenu()
                            Qt::WindowDoesNotAcceptFocus);
     m_menu->setAttribute(Qt::WA_TranslucentBackground);
     m_menu->setAttribute(Qt::WA_ShowWithoutActivating);
-    for (int i = 0; i < MENU_ITEMS; ++i) {
+    for (int i = 0; i < MENU_ITEMS; ++i)
         m_menu->addAction(QString())->setData(i);
-    }
     m_menu->setFixedSize(MENU_SIZE);
     m_menuCursor = QPixmap(QStringLiteral(":/Menu/List_Cursor"));
     m_menuSeparator = QPixmap(QStringLiteral(":/Separator_H"));
@@ -183,9 +181,8 @@ void ToolsBar::translateText()
     m_close.label->setText(tr("Close"));
     const QString items[MENU_ITEMS] = {tr("Black"), tr("White"), tr("Checker")};
     const QList<QAction*> actions = m_menu->actions();
-    for (int i = 0; i < MENU_ITEMS; ++i) {
+    for (int i = 0; i < MENU_ITEMS; ++i)
         actions.at(i)->setText(items[i]);
-    }
     m_menu->setFixedSize(MENU_SIZE);
     m_menu->update();
 }
@@ -245,9 +242,8 @@ void ToolsBar::resetSafeArea()
     const bool wasShown = m_safeAreaShown;
     m_safeAreaShown = false;
     showReleased(m_safeArea);
-    if (wasShown) {
+    if (wasShown)
         Q_EMIT SafeAreaButtonClickedForDrawRect(false);
-    }
 }
 
 // States
@@ -262,11 +258,10 @@ void ToolsBar::setToolEnabled(const ToolButton& tool, bool enabled)
     } else {
         // The other buttons keep their touches: a timer that pushes an undo step disables Redo at any time,
         // even while a finger is on another widget.
-        if (tool.button->isDown() || tool.button == m_text.button) {
+        if (tool.button->isDown() || tool.button == m_text.button)
             setPushButtonDisabled(tool.button);
-        } else {
+        else
             tool.button->setEnabled(false);
-        }
         tool.button->changeButtonState(KSPushbutton::ButtonDisabled);
     }
 }
@@ -276,9 +271,8 @@ void ToolsBar::setToolEnabled(const ToolButton& tool, bool enabled)
 void ToolsBar::setPushButtonDisabled(QPushButton* button)
 {
     button->setEnabled(false);
-    if (APPEventFilter* filter = APPEventFilter::instance()) {
+    if (APPEventFilter* filter = APPEventFilter::instance())
         filter->unlock();
-    }
 }
 
 void ToolsBar::setUndoButtonEnabled()
@@ -298,11 +292,10 @@ void ToolsBar::changeBtnStatus(bool hasSelectedItem)
 
 void ToolsBar::slotDisableNewTextButton(bool disable)
 {
-    if (disable) {
+    if (disable)
         setToolEnabled(m_text, false);
-    } else if (!m_text.button->isEnabled()) {
+    else if (!m_text.button->isEnabled())
         setToolEnabled(m_text, true);
-    }
 }
 
 void ToolsBar::setFolderButtonEnabled(bool enabled)
@@ -355,9 +348,8 @@ void ToolsBar::showReleased(const ToolButton& tool)
 
 void ToolsBar::showCanvasMenu()
 {
-    if (m_canvas.button->isTouchCancelled()) {
+    if (m_canvas.button->isTouchCancelled())
         return;
-    }
     logTap(L"Tap Canvas Button");
     if (m_menu->isVisible()) {
         m_menu->hide();
@@ -455,9 +447,8 @@ void ToolsBar::onMouseButtonMove(QMouseEvent* event)
 void ToolsBar::onMouseLeave()
 {
     m_menuItem = -1;
-    if (m_menu->isVisible()) {
+    if (m_menu->isVisible())
         m_menu->update();
-    }
 }
 
 QRect ToolsBar::getMenuItemRect(const QRect& rect, int index)
@@ -471,11 +462,9 @@ QRect ToolsBar::getMenuItemRect(const QRect& rect, int index)
 
 int ToolsBar::cursorItem(const QPoint& point) const
 {
-    for (int i = 0; i < MENU_ITEMS; ++i) {
-        if (getMenuItemRect(m_menu->rect(), i).contains(point)) {
+    for (int i = 0; i < MENU_ITEMS; ++i)
+        if (getMenuItemRect(m_menu->rect(), i).contains(point))
             return i;
-        }
-    }
     return -1;
 }
 
@@ -488,9 +477,8 @@ void ToolsBar::drawMenuItem(QPainter* painter)
     const QList<QAction*> actions = m_menu->actions();
     for (int i = 0; i < MENU_ITEMS; ++i) {
         const QRect area = getMenuItemRect(m_menu->rect(), i);
-        if (i == m_menuItem) {
+        if (i == m_menuItem)
             painter->drawPixmap(area, m_menuCursor);
-        }
         if (i > 0) {
             painter->drawPixmap(QRect(area.left(), area.top() - m_menuSeparator.height(), area.width(),
                                       m_menuSeparator.height()),

@@ -48,9 +48,8 @@ bool Appliance::connectToTitler()
 
 ITitler* Appliance::titler()
 {
-    if (!m_main->connectTo(ServiceTable::TITLER_CLIENT)) {
+    if (!m_main->connectTo(ServiceTable::TITLER_CLIENT))
         return nullptr;
-    }
     if (m_titler == nullptr) {
         void* instance = nullptr;
         m_main->createInstance(TitlerAdapter::INTERFACE_ID, &instance);
@@ -62,9 +61,8 @@ ITitler* Appliance::titler()
 bool Appliance::registerAtTitler()
 {
     ITitler* service = titler();
-    if (service == nullptr) {
+    if (service == nullptr)
         return false;
-    }
     service->registerCallBack(this);
     return true;
 }
@@ -94,9 +92,8 @@ int Appliance::countCalls(const QString& service, const QString& method) const
 
 std::optional<QJsonObject> Appliance::takeResult()
 {
-    if (m_results.empty()) {
+    if (m_results.empty())
         return std::nullopt;
-    }
     QJsonObject result = m_results.front();
     m_results.pop_front();
     return result;
@@ -136,11 +133,10 @@ void Appliance::handleCall(const ServiceDescription& service, const ServiceMetho
         client.notify = std::move(proxy);
         break;
     case ServiceMethod::Kind::Call:
-        if (methodName.startsWith("unregister")) {
+        if (methodName.startsWith("unregister"))
             unregister(serviceName, methodName, args["clientId"].toInt());
-        } else {
+        else
             answer(service.interfaceId, method.id, args);
-        }
         break;
     }
 }
@@ -148,17 +144,15 @@ void Appliance::handleCall(const ServiceDescription& service, const ServiceMetho
 void Appliance::keep(const QJsonObject& event)
 {
     m_calls.push_back({event});
-    if (m_calls.size() > KEPT_CALLS) {
+    if (m_calls.size() > KEPT_CALLS)
         m_calls.pop_front();
-    }
 }
 
 template <typename CallBack>
 bool Appliance::giveClientId(void (CallBack::*give)(int), const QString& service, int id)
 {
-    if (service != CallBack::Calls::NAME || callBackOf<CallBack>() == nullptr) {
+    if (service != CallBack::Calls::NAME || callBackOf<CallBack>() == nullptr)
         return false;
-    }
     (callBackOf<CallBack>()->*give)(id);
     return true;
 }
@@ -181,14 +175,12 @@ void Appliance::giveClientId(const QString& service)
 void Appliance::unregister(const QString& service, const QString& method, int clientId)
 {
     Client& client = m_clients[service];
-    if (clientId != client.clientId) {
+    if (clientId != client.clientId)
         return;
-    }
-    if (method == "unregisterCallBack") {
+    if (method == "unregisterCallBack")
         client.callBack.reset();
-    } else {
+    else
         client.notify.reset();
-    }
 }
 
 void Appliance::answer(long interfaceId, long method, const QJsonObject& args)
@@ -213,9 +205,8 @@ void Appliance::answerMessageCenter(long method, const QJsonObject& args)
     auto* notify = notifyOf<IMessageCenterNotify>();
     if (method == IMessageCenter::METHOD_setTopWindow) {
         state.topWindow = args["topWindow"].toInt();
-        if (notify != nullptr) {
+        if (notify != nullptr)
             notify->getTopWindowNotify(state.topWindow);
-        }
     } else if (method == IMessageCenter::METHOD_getTopWindow && callBack != nullptr) {
         callBack->getTopWindowCallBack(state.topWindow);
     } else if (method == IMessageCenter::METHOD_postMessage && notify != nullptr) {
@@ -228,40 +219,35 @@ void Appliance::answerMessageCenter(long method, const QJsonObject& args)
 void Appliance::answerEventFilter(long method, const QJsonObject& args)
 {
     auto* notify = notifyOf<IAPPEventFilterNotify>();
-    if (notify == nullptr || !options.eventEcho) {
+    if (notify == nullptr || !options.eventEcho)
         return;
-    }
-    if (method == IAPPEventFilter::METHOD_postAPPEventFilter) {
+    if (method == IAPPEventFilter::METHOD_postAPPEventFilter)
         notify->postAPPEventFilterNotify(JsonRecords::fromJson<APPEventDefine::_tagAPPEvent>(args));
-    } else if (method == IAPPEventFilter::METHOD_postRestoreOriginal) {
+    else if (method == IAPPEventFilter::METHOD_postRestoreOriginal)
         notify->postRestoreOriginalNotify(JsonRecords::fromJson<APPEventDefine::_tagAPPEvent>(args));
-    } else if (method == IAPPEventFilter::METHOD_postRestoreFocus) {
+    else if (method == IAPPEventFilter::METHOD_postRestoreFocus)
         notify->postRestoreFocusNotify();
-    }
 }
 
 void Appliance::answerKeyboard(long method, const QJsonObject& args)
 {
     using Keyboard = ISoftKeyBoardController;
     auto* callBack = callBackOf<ISoftKeyBoardControllerCallBack>();
-    if (callBack == nullptr) {
+    if (callBack == nullptr)
         return;
-    }
-    if (method == Keyboard::METHOD_sendKey && options.keyEcho) {
+    if (method == Keyboard::METHOD_sendKey && options.keyEcho)
         callBack->sendKey(JsonRecords::fromJson<SubCommonDefine::tagSoftKeyBoardKeyData>(args));
-    } else if ((method == Keyboard::METHOD_close || method == Keyboard::METHOD_dummyClose ||
-                method == Keyboard::METHOD_simpleClose) &&
-               options.stateOnClose) {
+    else if ((method == Keyboard::METHOD_close || method == Keyboard::METHOD_dummyClose ||
+              method == Keyboard::METHOD_simpleClose) &&
+             options.stateOnClose)
         callBack->sendSoftKeyboardState(false);
-    }
 }
 
 void Appliance::answerSystemSetup(long method)
 {
     auto* callBack = callBackOf<ISystemSetupManagerCallBack>();
-    if (callBack == nullptr) {
+    if (callBack == nullptr)
         return;
-    }
     if (method == ISystemSetupManager::METHOD_getLanguageInfo) {
         callBack->getLanguageInfoCallBack(
             {clientIdOf(ISystemSetupManager::NAME), state.systemLanguage, state.inputLanguage});

@@ -56,9 +56,8 @@ void CommandInterpreter::runLines()
     while (m_waitCondition == nullptr && !m_lines.empty()) {
         const CommandLine command(m_lines.front());
         m_lines.pop_front();
-        if (!command.word().isEmpty() && !command.word().startsWith('#')) {
+        if (!command.word().isEmpty() && !command.word().startsWith('#'))
             carryOut(command);
-        }
     }
     if (m_inputEnded && m_waitCondition == nullptr) {
         m_inputEnded = false;
@@ -74,27 +73,24 @@ void CommandInterpreter::carryOut(const CommandLine& command)
         return;
     }
     const QString problem = found->second(command);
-    if (!problem.isEmpty()) {
+    if (!problem.isEmpty())
         report("error", command.line(), problem);
-    } else if (m_waitCondition == nullptr) {
+    else if (m_waitCondition == nullptr)
         report("ok", command.line());
-    }
 }
 
 void CommandInterpreter::report(const char* event, const QString& command, const QString& message)
 {
     QJsonObject json{{"event", event}, {"command", command}};
-    if (!message.isEmpty()) {
+    if (!message.isEmpty())
         json.insert("message", message);
-    }
     m_sink(json);
 }
 
 QString CommandInterpreter::startWait(const CommandLine& command, int milliseconds, Condition condition)
 {
-    if (condition()) {
+    if (condition())
         return QString();
-    }
     m_waitCondition = std::move(condition);
     m_waitCommand = command.line();
     m_waitDeadline.setRemainingTime(milliseconds);
@@ -104,13 +100,11 @@ QString CommandInterpreter::startWait(const CommandLine& command, int millisecon
 
 void CommandInterpreter::checkWait()
 {
-    if (m_waitCondition == nullptr) {
+    if (m_waitCondition == nullptr)
         return;
-    }
     const bool fulfilled = m_waitCondition();
-    if (!fulfilled && !m_waitDeadline.hasExpired()) {
+    if (!fulfilled && !m_waitDeadline.hasExpired())
         return;
-    }
     m_waitTimer.stop();
     m_waitCondition = nullptr;
     report(fulfilled ? "ok" : "timeout", m_waitCommand);
@@ -205,9 +199,8 @@ void CommandInterpreter::addKeyboardCommands()
     addText("string-enter", &Keyboard::sendInputStringOnEnterPressing);
     addText("string-changed", &Keyboard::sendInputStringOnTextChanged);
     const auto sendKeys = [](Keyboard& client, const auto& keys) {
-        for (const SubCommonDefine::tagSoftKeyBoardKeyData& key : keys) {
+        for (const SubCommonDefine::tagSoftKeyBoardKeyData& key : keys)
             client.sendKey(key);
-        }
         return QString();
     };
     m_handlers["key"] = withCallBack<Keyboard>([sendKeys](Keyboard& client, const CommandLine& command) {
@@ -250,9 +243,8 @@ void CommandInterpreter::addServiceCommands()
         bool valid = true;
         const int messageId = command.number(0, &valid);
         const int closeType = command.number(1, &valid);
-        if (valid) {
+        if (valid)
             client.closeMessageNotify({m_appliance.clientIdOf(IMessageCenter::NAME), closeType, messageId});
-        }
         return valid ? QString() : QString(BAD_NUMBER);
     });
     m_handlers["top-window"] =
@@ -322,9 +314,8 @@ void CommandInterpreter::addFileCommands()
     using Files = IFileManagerControllerNotify;
     m_handlers["rename-folder"] = withNotify<Files>([this](Files& client, const CommandLine& command) {
         const QStringList names = command.arguments();
-        if (names.size() != 2) {
+        if (names.size() != 2)
             return QString(BAD_COUNT);
-        }
         client.updateFolderNameInCurrentProjectNotify({m_appliance.clientIdOf(IFileManagerController::NAME),
                                                        names[0].toStdWString(), names[1].toStdWString()});
         return QString();
@@ -373,15 +364,13 @@ void CommandInterpreter::addStateCommands()
         bool valid = true;
         const int systemLanguage = command.number(0, &valid);
         const int inputLanguage = command.number(1, &valid);
-        if (!valid) {
+        if (!valid)
             return QString(BAD_NUMBER);
-        }
         m_appliance.state.systemLanguage = systemLanguage;
         m_appliance.state.inputLanguage = inputLanguage;
-        if (auto* client = m_appliance.callBackOf<ISystemSetupManagerCallBack>()) {
+        if (auto* client = m_appliance.callBackOf<ISystemSetupManagerCallBack>())
             client->getLanguageInfoCallBack(
                 {m_appliance.clientIdOf(ISystemSetupManager::NAME), systemLanguage, inputLanguage});
-        }
         return QString();
     };
     const auto addLanguage = [&](const char* word, int Appliance::State::*field,
@@ -423,9 +412,8 @@ void CommandInterpreter::addStateCommands()
 void CommandInterpreter::addOption(const QString& word, bool Appliance::Options::*option)
 {
     m_handlers[word] = [this, option](const CommandLine& command) {
-        if (command.rest() != "on" && command.rest() != "off") {
+        if (command.rest() != "on" && command.rest() != "off")
             return QString("on or off");
-        }
         m_appliance.options.*option = command.rest() == "on";
         return QString();
     };

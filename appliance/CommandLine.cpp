@@ -37,9 +37,8 @@ CommandLine::CommandLine(const QString& line) : m_line(line)
     const QString trimmed = line.trimmed();
     const qsizetype wordEnd = trimmed.indexOf(' ');
     m_word = trimmed.left(wordEnd);
-    if (wordEnd == -1) {
+    if (wordEnd == -1)
         return;
-    }
     // Keep blanks at the end of the line; they belong to a text argument.
     const QString behind = line.mid(line.indexOf(m_word) + m_word.size() + 1);
     qsizetype at = 0;

@@ -8,9 +8,8 @@ namespace JsonRecords
 QJsonObject toJson(const _CALLBACK_TITLER_PARAMTER& record)
 {
     QJsonArray paths;
-    for (const std::wstring& path : TitlerParams::unpackPaths(record)) {
+    for (const std::wstring& path : TitlerParams::unpackPaths(record))
         paths.append(toValue(path));
-    }
     return {{"type", record.type},
             {"path", toValue(record.path)},
             {"size", record.size},

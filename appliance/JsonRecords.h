@@ -30,9 +30,8 @@ template <typename Value, std::size_t COUNT>
 QJsonValue toValue(const Value (&values)[COUNT])
 {
     QJsonArray array;
-    for (const Value& value : values) {
+    for (const Value& value : values)
         array.append(toValue(value));
-    }
     return array;
 }
 

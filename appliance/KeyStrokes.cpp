@@ -40,27 +40,23 @@ std::vector<Key> ofName(const QString& name)
 {
     QStringList parts = name.split('+');
     const QString last = parts.takeLast();
-    if (last.isEmpty() || (parts.isEmpty() && last.size() == 1)) {
+    if (last.isEmpty() || (parts.isEmpty() && last.size() == 1))
         return {};
-    }
     int modifiers = 0;
-    for (const QString& part : parts) {
-        if (part == "Shift") {
+    for (const QString& part : parts)
+        if (part == "Shift")
             modifiers |= Qt::ShiftModifier;
-        } else if (part == "Ctrl") {
+        else if (part == "Ctrl")
             modifiers |= Qt::ControlModifier;
-        } else if (part == "Alt") {
+        else if (part == "Alt")
             modifiers |= Qt::AltModifier;
-        } else {
+        else
             return {};
-        }
-    }
     bool known = false;
     const int code =
         QMetaEnum::fromType<Qt::Key>().keyToValue(("Key_" + last).toLatin1().constData(), &known);
-    if (!known) {
+    if (!known)
         return {};
-    }
     return pressAndRelease(code, modifiers, modifiers == 0 ? textOfKey(code) : QString());
 }
 
@@ -72,9 +68,8 @@ std::vector<Key> ofText(const QString& text)
         const bool upper = QChar::isUpper(character);
         const int code = static_cast<int>(QChar::toUpper(character));
         for (const Key& key : pressAndRelease(code, upper ? static_cast<int>(Qt::ShiftModifier) : 0,
-                                              QString::fromUcs4(&character, 1))) {
+                                              QString::fromUcs4(&character, 1)))
             keys.push_back(key);
-        }
     }
     return keys;
 }

@@ -20,9 +20,8 @@ void LineReader::readMore()
         emitLines();
     } else if (count == 0 || (errno != EINTR && errno != EAGAIN)) {
         m_notifier.setEnabled(false);
-        if (!m_buffer.isEmpty()) {
+        if (!m_buffer.isEmpty())
             Q_EMIT lineRead(QString::fromUtf8(std::exchange(m_buffer, QByteArray())));
-        }
         Q_EMIT ended();
     }
 }

@@ -118,9 +118,8 @@ std::vector<SampleTitles::Sample> PresetTemplates::samples(bool chinese)
         for (const Words& words : design.words) {
             Look look = words.look;
             look.family = chinese ? "DFHeiW5-A" : "KST";
-            if (chinese && words.chineseSize > 0) {
+            if (chinese && words.chineseSize > 0)
                 look.size = words.chineseSize;
-            }
             look.italic = chinese ? 0 : look.italic; // no italics for ideographs
             const char* text = chinese ? words.chinese : words.english;
             lines.push_back({text, SampleText::placed(look, text, words.x, words.y)});

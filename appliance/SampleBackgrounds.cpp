@@ -41,11 +41,9 @@ void paintBuildings(QPainter& painter, QRandomGenerator& random, const QColor& w
         const QRect house(left, ground - height, width, height);
         painter.fillRect(house, wall);
         for (int y = house.top() + 16; y < ground - 12; y += 26) {
-            for (int x = house.left() + 10; x < house.right() - 12; x += 22) {
-                if (random.bounded(100) < litPercent) {
+            for (int x = house.left() + 10; x < house.right() - 12; x += 22)
+                if (random.bounded(100) < litPercent)
                     painter.fillRect(x, y, 10, 14, QColor(255, 214, 120, 200));
-                }
-            }
         }
         left += width + random.bounded(4, 24);
     }

@@ -78,9 +78,8 @@ SampleText::Look SampleText::placed(Look look, const char* utf8, double x, doubl
     const QFontMetricsF metrics(fontOf(look));
     double width = 0;
     const QStringList lines = QString::fromUtf8(utf8).split(QLatin1Char('\n'));
-    for (const QString& line : lines) {
+    for (const QString& line : lines)
         width = qMax(width, metrics.horizontalAdvance(line));
-    }
     // In addition to the margin of the document every line has a margin, which leaves room for the handles.
     const double margin = TextObjectConstants::MARGIN_SHARE_OF_LINE / 2 * metrics.height();
     const double left = (look.align == LEFT ? x : look.align == CENTRE ? x - width / 2 : x - width) - margin;

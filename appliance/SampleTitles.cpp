@@ -97,9 +97,8 @@ SampleTitles::Sample SampleTitles::sample(const char* stem, std::function<QImage
 {
     Sample made{stem, std::move(background), Archive()};
     std::vector<TText*> texts; // owned by the record after setText
-    for (const Line& line : lines) {
+    for (const Line& line : lines)
         texts.push_back(SampleText::make(static_cast<int>(texts.size()) + 1, line.text, line.look).release());
-    }
     made.archive.setText(std::move(texts));
     made.archive.setVersion("1.0");
     return made;

@@ -17,9 +17,8 @@ void ServiceAdapter::setTarget(void*)
 void ServiceAdapter::receive(PTC::Event* event)
 {
     const auto method = std::ranges::find(m_service.methods, event->getMethodId(), &ServiceMethod::id);
-    if (method == m_service.methods.end()) {
+    if (method == m_service.methods.end())
         return;
-    }
     const QJsonObject args = method->decode(method->parameter, event->getData(), event->getSize());
     m_handler(m_service, *method, args, proxyFor(*method, args));
 }
@@ -27,9 +26,8 @@ void ServiceAdapter::receive(PTC::Event* event)
 std::unique_ptr<PTC::IProxyBase> ServiceAdapter::proxyFor(const ServiceMethod& method,
                                                           const QJsonObject& args)
 {
-    if (method.kind == ServiceMethod::Kind::Call) {
+    if (method.kind == ServiceMethod::Kind::Call)
         return nullptr;
-    }
     const bool callBack = method.kind == ServiceMethod::Kind::RegisterCallBack;
     const long type = callBack ? m_service.callBackAdapterType : m_service.notifyAdapterType;
     return std::unique_ptr<PTC::IProxyBase>(

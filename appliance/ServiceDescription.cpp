@@ -23,11 +23,10 @@ QJsonObject decode(const char* name, void* data, long size)
 {
     Parameter parameter{};
     RecordPacking::deserialize(parameter, data, size);
-    if constexpr (RecordPacking::HasFields<Parameter>) {
+    if constexpr (RecordPacking::HasFields<Parameter>)
         return JsonRecords::toJson(parameter);
-    } else {
+    else
         return {{QLatin1String(name), JsonRecords::toValue(parameter)}};
-    }
 }
 
 template <typename Interface>

@@ -36,9 +36,8 @@ void Sibling::createInstance(long id, void** instance)
 {
     SocketRemoteSender* sender =
         id == TitlerAdapter::INTERFACE_ID ? senderTo(ServiceTable::TITLER_CLIENT) : nullptr;
-    if (sender == nullptr) {
+    if (sender == nullptr)
         return;
-    }
     auto* proxy = new TitlerRemoteProxy(id);
     proxy->setSender(sender);
     proxy->setAdapterFactory(this);
@@ -48,9 +47,8 @@ void Sibling::createInstance(long id, void** instance)
 
 PTC::IAdapterBase* Sibling::createAdapter(long type, PTC::IReceiver* receiver, void* target)
 {
-    if (type != TitlerAdapter::CALLBACK_INTERFACE_ID) {
+    if (type != TitlerAdapter::CALLBACK_INTERFACE_ID)
         return nullptr;
-    }
     auto* adapter = new TitlerCallBackAdapter(++m_lastAdapterId);
     adapter->setTarget(target);
     receiver->addCBAdapter(adapter);
@@ -61,9 +59,8 @@ PTC::IProxyBase* Sibling::createProxy(long type, long id, long client)
 {
     std::unique_ptr<PTC::CallbackProxy> proxy(ServiceFamilies::createClientProxy(type, id));
     SocketRemoteSender* sender = proxy != nullptr ? senderTo(client) : nullptr;
-    if (sender == nullptr) {
+    if (sender == nullptr)
         return nullptr;
-    }
     proxy->setSender(sender);
     return proxy.release();
 }
@@ -84,9 +81,8 @@ SocketRemoteSender* Sibling::senderTo(long client)
         return usable || sender->initialize(client) ? sender : nullptr;
     }
     auto fresh = std::make_unique<SocketRemoteSender>(key);
-    if (!fresh->initialize(client)) {
+    if (!fresh->initialize(client))
         return nullptr;
-    }
     sender = fresh.release();
     addSender(sender);
     return sender;

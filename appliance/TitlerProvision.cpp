@@ -64,9 +64,8 @@ QString TitlerProvision::basePathOfEnvironment()
 {
     std::array<char, PATH_BUFFER> data{};
     std::array<char, PATH_BUFFER> root{};
-    if (k2sys_getenv_ac_data(data.data(), data.size()) < 0) {
+    if (k2sys_getenv_ac_data(data.data(), data.size()) < 0)
         return {};
-    }
     QString path = QString::fromLocal8Bit(data.data());
     // As the titler does: if the root path is "/", the data path is used without its leading "/".
     if (k2sys_getenv_ac_root(root.data(), root.size()) == 1) {
@@ -84,13 +83,11 @@ bool TitlerProvision::writeMissing()
 bool TitlerProvision::writePathFile()
 {
     const QString path = mBase + QStringLiteral("PathInfo.xml");
-    if (QFileInfo::exists(path)) {
+    if (QFileInfo::exists(path))
         return true;
-    }
     QSaveFile file(path);
-    if (!file.open(QIODevice::WriteOnly)) {
+    if (!file.open(QIODevice::WriteOnly))
         return fail(path + QStringLiteral(": ") + file.errorString());
-    }
     QXmlStreamWriter xml(&file);
     xml.setAutoFormatting(true);
     xml.writeStartDocument();
@@ -106,15 +103,13 @@ bool TitlerProvision::writePathFile()
 bool TitlerProvision::writeCheckers()
 {
     const QString folder = mBase + QLatin1String(TEMPLATES);
-    if (!makeFolder(folder)) {
+    if (!makeFolder(folder))
         return false;
-    }
     for (const QSize& size : {QSize(240, 135), QSize(135, 135)}) {
         const QString path =
             QStringLiteral("%1/checker_%2x%3.png").arg(folder).arg(size.width()).arg(size.height());
-        if (!QFileInfo::exists(path) && !writePicture(SampleBackgrounds::checker(size), path)) {
+        if (!QFileInfo::exists(path) && !writePicture(SampleBackgrounds::checker(size), path))
             return false;
-        }
     }
     return true;
 }
@@ -129,9 +124,8 @@ bool TitlerProvision::writeTemplates()
 
 bool TitlerProvision::writeTemplateSet(ThumbnailRender& render, const QString& folder, bool chinese)
 {
-    if (QFileInfo::exists(folder)) {
+    if (QFileInfo::exists(folder))
         return true;
-    }
     // Titles name preset backgrounds by absolute paths, so these are written to their final folder at once.
     const QString backgrounds = mBase + QLatin1String(TEMPLATES) + QStringLiteral("/backgrounds");
     std::vector<SampleTitles::Sample> samples = PresetTemplates::samples(chinese);
@@ -143,20 +137,17 @@ bool TitlerProvision::writeTitles()
     // Samples are only written to a new data path: once the folder of titles exists, deleted samples must not
     // come back.
     const QString root = mBase + QLatin1String(TITLES);
-    if (QFileInfo::exists(root)) {
+    if (QFileInfo::exists(root))
         return true;
-    }
     const QString aside = asideOf(root);
     QDir(aside).removeRecursively();
-    if (!makeFolder(aside)) {
+    if (!makeFolder(aside))
         return false;
-    }
     ThumbnailRender render;
     for (SampleTitles::Folder& folder : SampleTitles::folders()) {
         const QString path = aside + QLatin1Char('/') + QString::fromStdString(folder.name);
-        if (!writeFolder(render, path, folder.samples, QString())) {
+        if (!writeFolder(render, path, folder.samples, QString()))
             return false;
-        }
     }
     return moveIntoPlace(aside, root);
 }
@@ -166,14 +157,12 @@ bool TitlerProvision::writeFolder(ThumbnailRender& render, const QString& folder
 {
     const QString aside = asideOf(folder);
     QDir(aside).removeRecursively();
-    if (!makeFolder(aside)) {
+    if (!makeFolder(aside))
         return false;
-    }
     std::vector<ArchiveOrder> order;
     for (SampleTitles::Sample& sample : samples) {
-        if (!writeTitle(render, aside, sample, backgroundFolder)) {
+        if (!writeTitle(render, aside, sample, backgroundFolder))
             return false;
-        }
         ArchiveOrder row;
         row.setArchiveIndex(static_cast<int>(order.size()));
         row.setArchivePath(sample.stem + ".xml");
@@ -200,17 +189,15 @@ bool TitlerProvision::writeTitle(ThumbnailRender& render, const QString& folder,
         const QString where = (own ? folder : backgroundFolder) + QLatin1Char('/');
         const QString name = QString::fromStdString(stem) + QStringLiteral("_source_%1.png");
         if (!writePicture(sample.background(QSize(1280, 720)), where + name.arg(1280)) ||
-            !writePicture(sample.background(QSize(1920, 1080)), where + name.arg(1920))) {
+            !writePicture(sample.background(QSize(1920, 1080)), where + name.arg(1920)))
             return false;
-        }
         const QString prefix = own ? QString() : where;
         archive.setBgResource((prefix + name.arg(1280)).toStdString());
         archive.setBgResourceBig((prefix + name.arg(1920)).toStdString());
     }
     if (TitleParser().writeOneTitle(&archive) != 1 ||
-        !QFileInfo::exists(QString::fromStdString(archive.getPath()))) {
+        !QFileInfo::exists(QString::fromStdString(archive.getPath())))
         return fail(QStringLiteral("cannot write ") + QString::fromStdString(archive.getPath()));
-    }
     render.makeThumbnail(&archive, true);
     const QDeadlineTimer deadline(PICTURES_TIMEOUT_MS);
     while (!render.makePictureThreadIsFinished()) {
@@ -223,9 +210,8 @@ bool TitlerProvision::writeTitle(ThumbnailRender& render, const QString& folder,
     for (const std::string& picture : {archive.getThumbnailBig(), archive.getThumbnailMiddle(),
                                        archive.getThumbnailSmall(), archive.getThumbnailBlack()}) {
         const QString path = folder + QLatin1Char('/') + QString::fromStdString(picture);
-        if (!QFileInfo::exists(path)) {
+        if (!QFileInfo::exists(path))
             return fail(QStringLiteral("cannot write ") + path);
-        }
     }
     return true;
 }
@@ -233,9 +219,8 @@ bool TitlerProvision::writeTitle(ThumbnailRender& render, const QString& folder,
 bool TitlerProvision::writePicture(const QImage& picture, const QString& path)
 {
     QSaveFile file(path);
-    if (!file.open(QIODevice::WriteOnly) || !picture.save(&file, "PNG") || !file.commit()) {
+    if (!file.open(QIODevice::WriteOnly) || !picture.save(&file, "PNG") || !file.commit())
         return fail(path + QStringLiteral(": ") + file.errorString());
-    }
     return true;
 }
 

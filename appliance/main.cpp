@@ -49,9 +49,8 @@ int main(int argc, char** argv)
                      Qt::QueuedConnection);
     LineReader reader(STDIN_FILENO);
     QObject::connect(&reader, &LineReader::lineRead, &interpreter, &CommandInterpreter::addLine);
-    if (!options.isSet(stay)) {
+    if (!options.isSet(stay))
         QObject::connect(&reader, &LineReader::ended, &interpreter, &CommandInterpreter::endOfInput);
-    }
     writeEvent({{"event", "ready"}});
     return QCoreApplication::exec();
 }

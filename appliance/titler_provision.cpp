@@ -27,9 +27,8 @@ int main(int argc, char* argv[])
         return DataPathCheck::EXIT_CODE;
     }
     const QString base = TitlerProvision::basePathOfEnvironment();
-    if (QFontInfo(QFont(QStringLiteral("KST"))).family() != QStringLiteral("KST")) {
+    if (QFontInfo(QFont(QStringLiteral("KST"))).family() != QStringLiteral("KST"))
         err << "titler_provision: the fonts of the build are not in use (FONTCONFIG_FILE)\n";
-    }
     TitlerProvision provision(base);
     if (!provision.writeMissing()) {
         err << "titler_provision: " << provision.error() << "\n";

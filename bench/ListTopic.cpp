@@ -272,10 +272,9 @@ void openFirstScreen(benchmark::State& state, const QString& folder)
 
 void decodePictures(benchmark::State& state, const QStringList& paths)
 {
-    for ([[maybe_unused]] auto _ : state) {
+    for ([[maybe_unused]] auto _ : state)
         for (const QString& path : paths)
             benchmark::DoNotOptimize(QImageReader(path).read());
-    }
 }
 
 } // namespace

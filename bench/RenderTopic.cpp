@@ -76,12 +76,11 @@ void fillWithShadow(QPainter& painter, const Drawing& drawing)
 void draw(QPainter& painter, const std::vector<Drawing>& drawings)
 {
     painter.setRenderHint(QPainter::Antialiasing);
-    for (const Drawing& drawing : drawings) {
+    for (const Drawing& drawing : drawings)
         if (drawing.shadow)
             fillWithShadow(painter, drawing);
         else
             fillPaths(painter, drawing, QPointF());
-    }
 }
 
 // Records what the text paints without its shadow.

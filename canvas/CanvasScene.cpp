@@ -337,10 +337,9 @@ void CanvasScene::slotChangeObjectTextStyle(TText* style, int id, int undoFlag)
 void CanvasScene::takeBackPreviews(const GraphicsText* except)
 {
     const QList<GraphicsText*> texts = m_texts->listed();
-    for (GraphicsText* item : texts) {
+    for (GraphicsText* item : texts)
         if (item != except)
             item->cancelPreview();
-    }
 }
 
 void CanvasScene::endPreview()
@@ -380,10 +379,9 @@ void CanvasScene::pushDeleteCommand(GraphicsText* item)
 void CanvasScene::slotDeleteEmptyItems()
 {
     const QList<GraphicsText*> texts = m_texts->enabledTexts();
-    for (GraphicsText* item : texts) {
+    for (GraphicsText* item : texts)
         if (item->isBlank() && item->getItemTText()->getTextObjectID() != m_currentPressedObjectId)
             pushDeleteCommand(item);
-    }
     update();
 }
 
@@ -391,10 +389,9 @@ void CanvasScene::deleteSelectedItems()
 {
     endPreview();
     const QList<GraphicsText*> texts = m_texts->enabledTexts();
-    for (GraphicsText* item : texts) {
+    for (GraphicsText* item : texts)
         if (item->getBoundingLineStatus() != FocusNone && !item->isBlank())
             pushDeleteCommand(item);
-    }
     update();
     disableTextPropertyArea();
 }
@@ -477,10 +474,9 @@ void CanvasScene::keyPressEvent(QKeyEvent* event)
 {
     endPreview();
     const QList<GraphicsText*> texts = m_texts->enabledTexts();
-    for (GraphicsText* item : texts) {
+    for (GraphicsText* item : texts)
         if (item->textInteractionFlags() == Qt::TextEditorInteraction)
             setFocusItem(item, Qt::OtherFocusReason);
-    }
     QGraphicsScene::keyPressEvent(event);
 }
 

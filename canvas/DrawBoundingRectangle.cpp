@@ -8,10 +8,9 @@ namespace
 QStringList pieceNames(const QString& prefix, const QString& bottom)
 {
     QStringList names;
-    for (const QString& row : {bottom, QStringLiteral("Middle"), QStringLiteral("Upper")}) {
+    for (const QString& row : {bottom, QStringLiteral("Middle"), QStringLiteral("Upper")})
         for (const char* column : {"_Right", "_Center", "_Left"})
             names.append(prefix + row + QLatin1String(column));
-    }
     return names;
 }
 

@@ -130,10 +130,9 @@ GraphicsText* GraphicsText::parentTextItem() const
 GraphicsText* GraphicsText::childTextItem() const
 {
     const QList<QGraphicsItem*> children = childItems();
-    for (QGraphicsItem* child : children) {
+    for (QGraphicsItem* child : children)
         if (child->type() == Type)
             return static_cast<GraphicsText*>(child);
-    }
     return nullptr;
 }
 

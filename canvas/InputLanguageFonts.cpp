@@ -58,10 +58,9 @@ int InputLanguageFonts::languageRow(SystemSetupDef::emInputLanguageType language
 
 int InputLanguageFonts::getSoftkeyboardMode(QChar character)
 {
-    for (const Range& range : LATIN_RANGES) {
+    for (const Range& range : LATIN_RANGES)
         if (character.unicode() >= range.first && character.unicode() <= range.last)
             return Latin;
-    }
     return Asian;
 }
 

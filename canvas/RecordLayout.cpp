@@ -150,10 +150,9 @@ void RecordLayout::adjustLeftAndRightMargin()
 {
     QTextDocument& document = m_parts.document;
     double tallest = 0.0;
-    for (QTextBlock block = document.begin(); block.isValid(); block = block.next()) {
+    for (QTextBlock block = document.begin(); block.isValid(); block = block.next())
         if (block.layout()->lineCount() > 0)
             tallest = std::max(tallest, block.layout()->lineAt(0).height());
-    }
     const double margin = marginOf(tallest);
 
     QTextCursor cursor(&document);

@@ -31,10 +31,9 @@ bool hasFolder(const RefusedWrites::File& file)
 void reportPictures(const std::vector<RefusedWrites::File>& written)
 {
     std::set<std::string> titles;
-    for (const RefusedWrites::File& file : written) {
+    for (const RefusedWrites::File& file : written)
         if (!file.title.empty())
             titles.insert(file.title);
-    }
     if (ITitleChangeReporter* reporter = ITitleChangeReporter::instance()) {
         for (const std::string& title : titles)
             reporter->changeTitlerStatus(FileManagerDefine::TITLE_PICTURES_CHANGED,
@@ -123,14 +122,12 @@ void SaveOutage::tell(FoldersAway foldersAway)
 
 void SaveOutage::logRefused()
 {
-    for (const RefusedWrites::File& file : RefusedWrites::files()) {
+    for (const RefusedWrites::File& file : RefusedWrites::files())
         if (m_logged.insert(file.path).second)
             log("cannot write " + file.path + ": " + std::strerror(file.error));
-    }
     if (!m_hasSyncFailed)
         return;
-    for (const std::string& path : FileSyncQueue::unsynced()) {
+    for (const std::string& path : FileSyncQueue::unsynced())
         if (m_logged.insert(path).second)
             log("cannot sync " + path);
-    }
 }

@@ -29,10 +29,9 @@ bool sameStyle(const TextStyle& a, const TextStyle& b)
 QString withPlainLineBreaks(QString text)
 {
     text.replace(QLatin1String("\r\n"), QLatin1String("\n"));
-    for (QChar& c : text) {
+    for (QChar& c : text)
         if (c == QLatin1Char('\r') || c == QChar::ParagraphSeparator || c == QChar::LineSeparator)
             c = QLatin1Char('\n');
-    }
     return text;
 }
 

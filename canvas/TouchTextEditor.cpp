@@ -578,10 +578,9 @@ void TouchTextEditor::selectionFromBeginToEnd(int begin, int end)
     cursor.setPosition(clampedPosition(begin));
     const bool forward = end > cursor.position();
     const auto step = forward ? QTextCursor::Right : QTextCursor::Left;
-    while (forward ? cursor.position() < end : cursor.position() > end) {
+    while (forward ? cursor.position() < end : cursor.position() > end)
         if (!cursor.movePosition(step, QTextCursor::KeepAnchor))
             break;
-    }
     m_surface.select(cursor);
 }
 

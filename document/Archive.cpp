@@ -67,10 +67,9 @@ Archive::~Archive()
 void Archive::cloneText(const std::vector<TText*>& text)
 {
     mText.reserve(text.size());
-    for (const TText* object : text) {
+    for (const TText* object : text)
         if (object)
             mText.push_back(new TText(*object));
-    }
 }
 
 void Archive::releaseVectorText()

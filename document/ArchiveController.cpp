@@ -63,10 +63,9 @@ int userTemplateNumber(const std::string& rowPath)
 int firstGap(std::vector<int> numbers)
 {
     std::sort(numbers.begin(), numbers.end());
-    for (std::size_t position = 0; position < numbers.size(); ++position) {
+    for (std::size_t position = 0; position < numbers.size(); ++position)
         if (numbers[position] != static_cast<int>(position) + 1)
             return static_cast<int>(position) + 1;
-    }
     return 0;
 }
 
@@ -141,10 +140,9 @@ QList<Archive*> ArchiveController::getArchiveList(QString folder)
 {
     const FolderTitles rows(folder.toStdString(), FolderTitles::WithoutOrder::ByName);
     QList<Archive*> titles;
-    for (std::unique_ptr<Archive>& title : rows.read(0, rows.count())) {
+    for (std::unique_ptr<Archive>& title : rows.read(0, rows.count()))
         if (title)
             titles.append(title.release());
-    }
     return titles;
 }
 
@@ -178,10 +176,9 @@ bool ArchiveController::saveArchiveListOrder(QString folder, QList<ArchiveOrder*
         return false;
     std::vector<ArchiveOrder> copies;
     copies.reserve(static_cast<std::size_t>(rows.size()));
-    for (const ArchiveOrder* row : rows) {
+    for (const ArchiveOrder* row : rows)
         if (row)
             copies.push_back(*row);
-    }
     return mArchiveManager->setArchivesSortUnderFolder(folder.toStdString(), std::move(copies)) == 1;
 }
 
@@ -272,10 +269,9 @@ int ArchiveController::copyArchiveThumbnail(Archive* from, Archive* to)
 QString ArchiveController::getFreeNameInUserTemplate(QString folder)
 {
     std::vector<int> numbers;
-    for (const ArchiveOrder* row : getFileOrder(folder)) {
+    for (const ArchiveOrder* row : getFileOrder(folder))
         if (const int number = userTemplateNumber(row->getArchivePath()))
             numbers.push_back(number);
-    }
     const int largest = numbers.empty() ? 0 : *std::max_element(numbers.begin(), numbers.end());
     int number = largest + 1;
     if (largest >= LARGEST_NUMBER) {
@@ -306,10 +302,9 @@ bool ArchiveController::createNewOrderAccordingToFilesUnderFolder(QString folder
 QList<std::string> ArchiveController::reCreateOrderXml()
 {
     QList<std::string> changed;
-    for (const std::string& folder : getFolderList()) {
+    for (const std::string& folder : getFolderList())
         if (createNewOrderAccordingToFilesUnderFolder(toQString(folder)))
             changed.append(folder);
-    }
     return changed;
 }
 

@@ -81,10 +81,9 @@ std::vector<ArchiveOrder> FolderOrder::rowsToShow(const std::string& folder)
 std::vector<ArchiveOrder> FolderOrder::rowsByName(const std::vector<std::string>& files)
 {
     std::vector<std::string> names;
-    for (const std::string& file : files) {
+    for (const std::string& file : files)
         if (ArchiveManager::isTitleFile(file))
             names.push_back(file.substr(file.rfind('/') + 1));
-    }
     std::sort(names.begin(), names.end());
     std::vector<ArchiveOrder> rows;
     for (const std::string& name : names) {

@@ -47,10 +47,9 @@ TText::~TText()
 void TText::cloneTextItems(const std::vector<TextStyle*>& items)
 {
     mTextItems.reserve(items.size());
-    for (const TextStyle* item : items) {
+    for (const TextStyle* item : items)
         if (item)
             mTextItems.push_back(new TextStyle(*item));
-    }
 }
 
 void TText::releaseVectorTextStyle()

@@ -97,10 +97,9 @@ std::string writable(const std::string& text)
 
 bool isWritable(std::string_view text)
 {
-    for (std::size_t i = 0; i < text.size(); ++i) {
+    for (std::size_t i = 0; i < text.size(); ++i)
         if (isControl(text, i) || isNonCharacter(text, i))
             return false;
-    }
     return Utf8::isValid(text);
 }
 
@@ -134,10 +133,9 @@ bool TitleParser::getNodePointerByName(TiXmlElement* start, const std::string& n
         out = start;
         return true;
     }
-    for (TiXmlElement* child = start->FirstChildElement(); child; child = child->NextSiblingElement()) {
+    for (TiXmlElement* child = start->FirstChildElement(); child; child = child->NextSiblingElement())
         if (getNodePointerByName(child, name, out))
             return true;
-    }
     return false;
 }
 
@@ -475,15 +473,13 @@ int TitleParser::writeFileOrderInFolder(std::string folder, std::vector<ArchiveO
 std::vector<Archive*> TitleParser::getFilsByOrderInFolder(std::string folder)
 {
     const FolderTitles titles(std::move(folder));
-    for (std::size_t row = 0; row < titles.count(); ++row) {
+    for (std::size_t row = 0; row < titles.count(); ++row)
         if (!titles.canBeTitle(row))
             throw std::out_of_range("a row too short for the name of a title file");
-    }
     std::vector<Archive*> result;
-    for (std::unique_ptr<Archive>& title : titles.read(0, titles.count())) {
+    for (std::unique_ptr<Archive>& title : titles.read(0, titles.count()))
         if (title)
             result.push_back(title.release());
-    }
     return result;
 }
 

@@ -42,10 +42,9 @@ std::vector<std::string> queryFolder(const std::string& folder, Accept accept)
     DIR* const directory = ::opendir(folder.c_str());
     if (!directory)
         return paths;
-    while (const dirent* entry = ::readdir(directory)) {
+    while (const dirent* entry = ::readdir(directory))
         if (accept(*entry))
             paths.push_back(folder + '/' + entry->d_name);
-    }
     ::closedir(directory);
     return paths;
 }

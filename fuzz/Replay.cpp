@@ -20,10 +20,9 @@ std::vector<fs::path> filesOf(const fs::path& place)
 {
     std::vector<fs::path> files;
     if (fs::is_directory(place)) {
-        for (const fs::directory_entry& entry : fs::directory_iterator(place)) {
+        for (const fs::directory_entry& entry : fs::directory_iterator(place))
             if (entry.is_regular_file())
                 files.push_back(entry.path());
-        }
         std::sort(files.begin(), files.end());
     } else if (fs::is_regular_file(place)) {
         files.push_back(place);

@@ -33,12 +33,11 @@ public:
 
     ElementPointer read()
     {
-        while (skipTo('<')) {
+        while (skipTo('<'))
             if (mRest.size() > 1 && (mRest[1] == '?' || mRest[1] == '!'))
                 mRest.remove_prefix(1);
             else
                 return element(0);
-        }
         return nullptr;
     }
 

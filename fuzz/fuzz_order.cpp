@@ -26,11 +26,10 @@ bool isSame(const Rows& a, const Rows& b)
 {
     if (a.size() != b.size())
         return false;
-    for (std::size_t i = 0; i < a.size(); ++i) {
+    for (std::size_t i = 0; i < a.size(); ++i)
         if (a[i]->getArchiveIndex() != b[i]->getArchiveIndex() ||
             a[i]->getArchivePath() != b[i]->getArchivePath())
             return false;
-    }
     return true;
 }
 

@@ -18,11 +18,9 @@ QString buttonImages(const QString& folder, const QString& rest, const QString& 
 {
     QString images = folder;
     for (const QString& base : {rest, selected}) {
-        for (const char* state : {"Rest", "Pressed", "Disabled"}) {
-            for (const char* slice : {"Left", "Center", "Right"}) {
+        for (const char* state : {"Rest", "Pressed", "Disabled"})
+            for (const char* slice : {"Left", "Center", "Right"})
                 images += QStringLiteral(":%1_%2_%3").arg(base, QLatin1String(state), QLatin1String(slice));
-            }
-        }
     }
     return images;
 }
@@ -75,9 +73,8 @@ GalleryPage GalleryPages::pushButtons()
                       QStringLiteral("Button_67selected")),
          67},
     };
-    for (int state = 0; state < KSPushbutton::ButtonStateCount; ++state) {
+    for (int state = 0; state < KSPushbutton::ButtonStateCount; ++state)
         page.caption(QPoint(20 + 155 * state, 12), QLatin1String(STATES[state]));
-    }
     int y = 40;
     for (const auto& family : families) {
         for (int state = 0; state < KSPushbutton::ButtonStateCount; ++state) {
@@ -106,9 +103,8 @@ GalleryPage GalleryPages::pushButtons()
     for (int i = 0; i < 4; ++i) {
         KSPushbutton* live = liveButton(families[0].images, QStringLiteral("Press me"), page.window.get());
         live->setGeometry(20 + 220 * i, 500, 200, 48);
-        if (i == 2) {
+        if (i == 2)
             live->setTouchRect(live->rect().adjusted(-20, -20, 20, 20));
-        }
         live->setEnabled(i != 3);
     }
     QWidget* held = page.window->childAt(QPoint(260, 520));

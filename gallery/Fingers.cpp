@@ -38,9 +38,8 @@ void Fingers::press(int finger, QWidget* window, const QPoint& position)
         move(finger, position);
         return;
     }
-    if (window == nullptr || window->window()->windowHandle() == nullptr) {
+    if (window == nullptr || window->window()->windowHandle() == nullptr)
         return;
-    }
     m_down.insert(finger, {m_nextId++, position, window->window()->windowHandle()});
     send(finger, QEventPoint::State::Pressed);
 }
@@ -53,34 +52,30 @@ void Fingers::pressWidget(int finger, QWidget* widget, const QPoint& position)
 void Fingers::move(int finger, const QPoint& position)
 {
     const auto it = m_down.find(finger);
-    if (it == m_down.end()) {
+    if (it == m_down.end())
         return;
-    }
     it->position = position;
     send(finger, QEventPoint::State::Updated);
 }
 
 void Fingers::lift(int finger)
 {
-    if (!m_down.contains(finger)) {
+    if (!m_down.contains(finger))
         return;
-    }
     send(finger, QEventPoint::State::Released);
     m_down.remove(finger);
 }
 
 void Fingers::liftAll()
 {
-    while (!m_down.isEmpty()) {
+    while (!m_down.isEmpty())
         lift(m_down.firstKey());
-    }
 }
 
 void Fingers::cancel()
 {
-    if (m_down.isEmpty()) {
+    if (m_down.isEmpty())
         return;
-    }
     QWindow* window = m_down.first().window;
     m_down.clear();
     m_time += STEP;

@@ -42,9 +42,8 @@ KSScrollViewerWidget* viewer(const GalleryPage& page, const QPoint& place, int i
     list->setSize(32 + 6 + ITEM_WIDTH, 560);
     list->move(place);
     QList<KSBaseItemWidget*> rows;
-    for (int i = 1; i <= items; ++i) {
+    for (int i = 1; i <= items; ++i)
         rows.append(new NamedItem(QStringLiteral("Title %1").arg(i)));
-    }
     list->addWidgetItems(&rows, -1);
     list->setHEffectiveArea(0, 32 + 6 + ITEM_WIDTH);
     QObject::connect(
@@ -96,9 +95,8 @@ GalleryPage GalleryPages::scrollViewer()
     KSScrollViewerWidget* movable = viewer(page, QPoint(500, 40), 20);
     movable->setVScrollBarAlignment(Qt::AlignRight);
     movable->setItemsDragFlagAlignment(DRAGFLAG_RIGHT);
-    for (int i = 0; i < movable->count(); ++i) {
+    for (int i = 0; i < movable->count(); ++i)
         movable->getWidgetItem(i)->setDragFlagAlignment(DRAGFLAG_RIGHT);
-    }
     movable->slotItemsCanDrag(true);
     page.pose = [plain, movable](Fingers&) {
         plain->moveToWidgetItem(0);
@@ -113,9 +111,8 @@ GalleryPage GalleryPages::liftedItem()
     page.caption(QPoint(20, 12), QStringLiteral("an item under the finger, and the gap where it would drop"));
     KSScrollViewerWidget* list = viewer(page, QPoint(20, 40), 20);
     list->setItemsDragFlagAlignment(DRAGFLAG_RIGHT);
-    for (int i = 0; i < list->count(); ++i) {
+    for (int i = 0; i < list->count(); ++i)
         list->getWidgetItem(i)->setDragFlagAlignment(DRAGFLAG_RIGHT);
-    }
     list->slotItemsCanDrag(true);
     page.caption(QPoint(500, 12), QStringLiteral("empty, and nothing to scroll"));
     viewer(page, QPoint(500, 40), 0)->setSize(32 + 6 + ITEM_WIDTH, 200);

@@ -32,11 +32,9 @@ template <class Widget>
 QList<Widget*> widgets()
 {
     QList<Widget*> result;
-    for (QWidget* widget : QApplication::allWidgets()) {
-        if (auto* found = qobject_cast<Widget*>(widget)) {
+    for (QWidget* widget : QApplication::allWidgets())
+        if (auto* found = qobject_cast<Widget*>(widget))
             result.append(found);
-        }
-    }
     return result;
 }
 
@@ -58,11 +56,9 @@ Monkey::Monkey(KSAppEventFilter* filter, quint32 seed) : m_filter(filter), m_ran
 QStringList Monkey::play(GalleryPage& page, int steps)
 {
     m_targets.clear();
-    for (const QWidget* child : page.window->findChildren<QWidget*>()) {
-        if (child->isVisibleTo(page.window.get()) && !child->isWindow() && !child->size().isEmpty()) {
+    for (const QWidget* child : page.window->findChildren<QWidget*>())
+        if (child->isVisibleTo(page.window.get()) && !child->isWindow() && !child->size().isEmpty())
             m_targets.append(QRect(child->mapTo(page.window.get(), QPoint(0, 0)), child->size()));
-        }
-    }
     for (int i = 1; i <= steps; ++i) {
         step(page);
         QCoreApplication::processEvents();
@@ -70,9 +66,8 @@ QStringList Monkey::play(GalleryPage& page, int steps)
             m_fingers.liftAll();
             QCoreApplication::processEvents();
             // Checked at once, before the watchdog can release the lock.
-            if (m_filter->isLock(nullptr, LOCKMETHOD_TOUCH)) {
+            if (m_filter->isLock(nullptr, LOCKMETHOD_TOUCH))
                 return {QStringLiteral("step %1: the touch lock is held by %2").arg(i).arg(holders())};
-            }
         }
     }
     QStringList problems;
@@ -88,11 +83,10 @@ void Monkey::step(const GalleryPage& page)
 {
     const int dice = number(100);
     if (m_fingers.count() == 0) {
-        if (dice < 8) {
+        if (dice < 8)
             mouse(page);
-        } else {
+        else
             press(page);
-        }
     } else if (dice < 55) {
         move();
     } else if (dice < 70) {
@@ -109,12 +103,10 @@ void Monkey::step(const GalleryPage& page)
 QList<QWidget*> Monkey::windows(const GalleryPage& page) const
 {
     QList<QWidget*> result;
-    for (QWidget* window : QApplication::topLevelWidgets()) {
+    for (QWidget* window : QApplication::topLevelWidgets())
         if (window != page.window.get() && window->isVisible() &&
-            !(window->windowFlags() & Qt::WindowTransparentForInput)) {
+            !(window->windowFlags() & Qt::WindowTransparentForInput))
             result.append(window);
-        }
-    }
     std::sort(result.begin(), result.end(), [](const QWidget* a, const QWidget* b) {
         return std::make_tuple(a->x(), a->y(), a->width()) < std::make_tuple(b->x(), b->y(), b->width());
     });
@@ -135,11 +127,9 @@ QPoint Monkey::anyPoint(const GalleryPage& page)
 QWidget* Monkey::windowAt(const GalleryPage& page, const QPoint& place) const
 {
     QWidget* window = page.window.get();
-    for (QWidget* other : windows(page)) {
-        if (other->geometry().contains(place)) {
+    for (QWidget* other : windows(page))
+        if (other->geometry().contains(place))
             window = other;
-        }
-    }
     return window;
 }
 
@@ -167,9 +157,8 @@ void Monkey::move()
 void Monkey::lift()
 {
     int finger = number(MOST_FINGERS);
-    for (int i = 0; i < MOST_FINGERS && !m_fingers.isDown(finger); ++i) {
+    for (int i = 0; i < MOST_FINGERS && !m_fingers.isDown(finger); ++i)
         finger = (finger + 1) % MOST_FINGERS;
-    }
     note(3, finger, QPoint());
     m_fingers.lift(finger);
 }
@@ -185,10 +174,9 @@ void Monkey::mouse(const GalleryPage& page)
     const QPointer<QWindow> handle = window->windowHandle();
     note(wheel ? 4 : 5, turn, place);
     const auto send = [&](Qt::MouseButtons buttons, Qt::MouseButton button, QEvent::Type type) {
-        if (handle) {
+        if (handle)
             QWindowSystemInterface::handleMouseEvent<QWindowSystemInterface::SynchronousDelivery>(
                 handle, handle->mapFromGlobal(place), place, buttons, button, type);
-        }
     };
     if (wheel) {
         QWindowSystemInterface::handleWheelEvent(handle, handle->mapFromGlobal(place), place, QPoint(),
@@ -205,9 +193,8 @@ void Monkey::mouse(const GalleryPage& page)
 
 void Monkey::note(int action, int finger, const QPoint& place)
 {
-    for (const int value : {action, finger, place.x(), place.y()}) {
+    for (const int value : {action, finger, place.x(), place.y()})
         m_input = (m_input ^ static_cast<quint32>(value)) * 16777619U;
-    }
 }
 
 QString Monkey::holders() const
@@ -215,11 +202,9 @@ QString Monkey::holders() const
     QStringList names;
     const QMap<KSLockObject*, QList<QObject*>> active = m_filter->activateLockObjects();
     for (const QList<QObject*>& objects : active) {
-        for (QWidget* widget : QApplication::allWidgets()) {
-            if (objects.contains(widget)) {
+        for (QWidget* widget : QApplication::allWidgets())
+            if (objects.contains(widget))
                 names.append(describe(widget));
-            }
-        }
     }
     return names.isEmpty() ? QStringLiteral("what is gone") : names.join(QStringLiteral(", "));
 }
@@ -227,53 +212,36 @@ QString Monkey::holders() const
 QStringList Monkey::leftovers()
 {
     QStringList problems;
-    if (QWidget* grabber = QWidget::mouseGrabber()) {
+    if (QWidget* grabber = QWidget::mouseGrabber())
         problems.append(QStringLiteral("the mouse is grabbed by ") + describe(grabber));
-    }
     for (const QAbstractButton* button : widgets<QAbstractButton>()) {
-        if (button->isDown()) {
+        if (button->isDown())
             problems.append(QStringLiteral("left down: ") + describe(button));
-        }
         const auto* push = qobject_cast<const KSPushbutton*>(button);
         if (push != nullptr && push->objectName() == QStringLiteral("live") &&
-            push->buttonState() == KSPushbutton::ButtonPressed) {
+            push->buttonState() == KSPushbutton::ButtonPressed)
             problems.append(QStringLiteral("left with its pressed look: ") + describe(button));
-        }
     }
-    for (const QAbstractSlider* slider : widgets<QAbstractSlider>()) {
-        if (slider->isSliderDown()) {
+    for (const QAbstractSlider* slider : widgets<QAbstractSlider>())
+        if (slider->isSliderDown())
             problems.append(QStringLiteral("left held: ") + describe(slider));
-        }
-    }
-    for (const KSScrollBar* bar : widgets<KSScrollBar>()) {
-        if (bar->isPressed()) {
+    for (const KSScrollBar* bar : widgets<KSScrollBar>())
+        if (bar->isPressed())
             problems.append(QStringLiteral("left pressed: ") + describe(bar));
-        }
-    }
-    for (const KSTabBar* bar : widgets<KSTabBar>()) {
-        if (bar->pressedTab() >= 0) {
+    for (const KSTabBar* bar : widgets<KSTabBar>())
+        if (bar->pressedTab() >= 0)
             problems.append(QStringLiteral("a tab is left pressed: ") + describe(bar));
-        }
-    }
-    for (const CustomComboBoxView* view : widgets<CustomComboBoxView>()) {
-        if (view->pressedIndex().isValid() || view->isAutoFilck()) {
+    for (const CustomComboBoxView* view : widgets<CustomComboBoxView>())
+        if (view->pressedIndex().isValid() || view->isAutoFilck())
             problems.append(QStringLiteral("a row is left pressed or the list runs: ") + describe(view));
-        }
-    }
-    for (const KSMenu* menu : widgets<KSMenu>()) {
-        if (!menu->isVisible() && menu->currentItem() >= 0) {
+    for (const KSMenu* menu : widgets<KSMenu>())
+        if (!menu->isVisible() && menu->currentItem() >= 0)
             problems.append(QStringLiteral("a row is left marked: ") + describe(menu));
-        }
-    }
-    for (const KSScrollViewerWidget* list : widgets<KSScrollViewerWidget>()) {
-        if (list->isDragging() || list->getMoveItem() != nullptr || list->isAutoFilck()) {
+    for (const KSScrollViewerWidget* list : widgets<KSScrollViewerWidget>())
+        if (list->isDragging() || list->getMoveItem() != nullptr || list->isAutoFilck())
             problems.append(QStringLiteral("an item is left lifted or the list runs: ") + describe(list));
-        }
-    }
-    for (KSTreeView* tree : widgets<KSTreeView>()) {
-        if (tree->isAutoFilck()) {
+    for (KSTreeView* tree : widgets<KSTreeView>())
+        if (tree->isAutoFilck())
             problems.append(QStringLiteral("the tree runs: ") + describe(tree));
-        }
-    }
     return problems;
 }

@@ -17,20 +17,17 @@ using Grid = QList<QRgb>;
 Grid parse(const QStringList& digest)
 {
     Grid grid;
-    if (digest.size() != PagePicture::ROWS) {
+    if (digest.size() != PagePicture::ROWS)
         return grid;
-    }
     for (const QString& line : digest) {
         const QStringList cells = line.split(QLatin1Char(' '), Qt::SkipEmptyParts);
-        if (cells.size() != PagePicture::COLUMNS) {
+        if (cells.size() != PagePicture::COLUMNS)
             return Grid();
-        }
         for (const QString& cell : cells) {
             bool valid = false;
             grid.append(cell.toUInt(&valid, 16) | 0xff000000U);
-            if (!valid) {
+            if (!valid)
                 return Grid();
-            }
         }
     }
     return grid;
@@ -76,27 +73,23 @@ QImage PagePicture::shoot(QWidget* window)
     QPainter painter(&picture);
     const QPoint origin = window->mapToGlobal(QPoint(0, 0));
     QList<QWidget*> others;
-    for (QWidget* other : QApplication::topLevelWidgets()) {
-        if (other != window && other->isVisible()) {
+    for (QWidget* other : QApplication::topLevelWidgets())
+        if (other != window && other->isVisible())
             others.append(other);
-        }
-    }
     // Sorted, since Qt returns the windows in no fixed order.
     std::sort(others.begin(), others.end(), [](const QWidget* a, const QWidget* b) {
         return std::make_pair(a->y(), a->x()) < std::make_pair(b->y(), b->x());
     });
-    for (QWidget* other : others) {
+    for (QWidget* other : others)
         painter.drawPixmap(other->pos() - origin, other->grab());
-    }
     return picture;
 }
 
 QStringList PagePicture::digest(const QImage& picture)
 {
     QStringList lines;
-    if (picture.isNull()) {
+    if (picture.isNull())
         return lines;
-    }
     const QImage source = picture.width() < COLUMNS || picture.height() < ROWS
                               ? picture.scaled(picture.size().expandedTo(QSize(COLUMNS, ROWS)))
                               : picture;
@@ -116,9 +109,8 @@ PagePicture::Difference PagePicture::compare(const QStringList& kept, const QStr
     const Grid a = parse(kept);
     const Grid b = parse(seen);
     Difference result;
-    if (a.isEmpty() || b.isEmpty()) {
+    if (a.isEmpty() || b.isEmpty())
         return result;
-    }
     result.sameShape = true;
     qint64 sum = 0;
     for (qsizetype i = 0; i < a.size(); ++i) {

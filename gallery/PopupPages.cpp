@@ -28,9 +28,8 @@ KSCombobox* comboBox(const GalleryPage& page, const QRect& place, const QStringL
 QStringList numbered(const QString& text, int count)
 {
     QStringList rows;
-    for (int i = 1; i <= count; ++i) {
+    for (int i = 1; i <= count; ++i)
         rows.append(text.arg(i));
-    }
     return rows;
 }
 
@@ -41,9 +40,8 @@ KSMenu* menuAt(const GalleryPage& page, const QPoint& place, const QString& text
         new KSPushbutton(QString::fromLatin1(KSPushbutton::STANDARD_IMAGES), text, page.window.get());
     button->setGeometry(QRect(place, QSize(140, 48)));
     auto* menu = new KSMenu(page.window.get());
-    for (const char* name : {"Create New", "Copy", "Paste", "Delete"}) {
+    for (const char* name : {"Create New", "Copy", "Paste", "Delete"})
         menu->addAction(QLatin1String(name));
-    }
     menu->actions().at(2)->setEnabled(false);
     menu->setBalloonAlignment(alignment);
     QObject::connect(button, &QAbstractButton::clicked, menu, [button, menu, alignment] {
@@ -106,9 +104,8 @@ GalleryPage GalleryPages::menus()
                                   QPoint(1190, 324), QPoint(130, 660), QPoint(710, 684)};
         for (int i = 0; i < menus.size(); ++i) {
             menus.at(i)->popup(window->mapToGlobal(anchors[i]));
-            if (i == 0) { // pressed while it is the only menu: a press would close the others
+            if (i == 0) // pressed while it is the only menu: a press would close the others
                 fingers.pressWidget(0, menus.at(0), menus.at(0)->getMenuItemRect(1).center());
-            }
         }
     };
     return page;
@@ -130,9 +127,8 @@ GalleryPage GalleryPages::balloons()
     QWidget* prompt = anchor(QRect(300, 400, 300, 48), QStringLiteral("Prompt"));
     QWidget* top = anchor(QRect(600, 10, 340, 48), QStringLiteral("Prompt at the top"));
     QList<Balloon*> list;
-    for (int i = 0; i < 4; ++i) {
+    for (int i = 0; i < 4; ++i)
         list.append(new Balloon(window));
-    }
     page.pose = [=](Fingers&) {
         KSToolTip::showText(QRect(tip->mapToGlobal(QPoint(0, 0)), tip->size()), QStringLiteral("10 px"));
         list.at(0)->showButtonText(button, QStringLiteral("Delete"));

@@ -28,9 +28,8 @@ SampleTree::SampleTree(QObject* parent) : KSModelDataFactory(parent)
         Node& folder =
             add(m_root, i == 3 ? QStringLiteral("A folder with a name that is too long for its cell")
                                : QStringLiteral("Folder %1").arg(i));
-        for (int j = 1; j <= FILES; ++j) {
+        for (int j = 1; j <= FILES; ++j)
             add(folder, QStringLiteral("Title %1").arg(j));
-        }
     }
 }
 
@@ -63,10 +62,8 @@ void SampleTree::InstallItemAttribute(KSModelAttributeItem* item, void* node)
         item->setAttributeMaxKey(Qt::DecorationRole, 1);
         item->setAttribute(Qt::DecorationRole, QIcon(QStringLiteral(":/FolderPicker/Titler_folder_icon")), 0);
     }
-    if (folder && here->number == 5) {
+    if (folder && here->number == 5)
         item->setAttribute(KSVIEW::ItemLoadingRole, 3, 0);
-    }
-    if (folder && here->number == 6) {
+    if (folder && here->number == 6)
         item->setAttribute(KSVIEW::ItemRecordingRole, true, 0);
-    }
 }

@@ -27,31 +27,26 @@ const char USAGE[] = "usage: gallery [--shoot DIR | --digest DIR | --monkey SEED
 
 QList<GalleryPages::Maker> chosen(const QStringList& names)
 {
-    if (names.isEmpty()) {
+    if (names.isEmpty())
         return GalleryPages::all();
-    }
     QList<GalleryPages::Maker> result;
-    for (const GalleryPages::Maker& maker : GalleryPages::all()) {
-        if (names.contains(maker().name)) {
+    for (const GalleryPages::Maker& maker : GalleryPages::all())
+        if (names.contains(maker().name))
             result.append(maker);
-        }
-    }
     return result;
 }
 
 int shoot(const QDir& folder, bool digests, const QStringList& names)
 {
-    if (!folder.mkpath(QStringLiteral("."))) {
+    if (!folder.mkpath(QStringLiteral(".")))
         return 1;
-    }
     for (const GalleryPages::Maker& maker : chosen(names)) {
         GalleryPage page = maker();
         const QImage picture = page.shoot();
         if (digests) {
             QFile file(folder.filePath(page.name + QStringLiteral(".txt")));
-            if (!file.open(QIODevice::WriteOnly)) {
+            if (!file.open(QIODevice::WriteOnly))
                 return 1;
-            }
             file.write(PagePicture::digest(picture).join(QLatin1Char('\n')).toLatin1() + '\n');
         } else if (!picture.save(folder.filePath(page.name + QStringLiteral(".png")))) {
             return 1;
@@ -65,9 +60,8 @@ int playMonkey(quint32 seed, int count, const QStringList& names)
 {
     APPEventFilter* filter = APPEventFilter::instance();
     const QList<GalleryPages::Maker> pages = chosen(names);
-    if (pages.isEmpty()) {
+    if (pages.isEmpty())
         return 2;
-    }
     int failures = 0;
     for (qsizetype i = 0; i < pages.size(); ++i) {
         // Each page has its own seed, so that it can be tested alone.
@@ -108,9 +102,8 @@ int showPages(const QStringList& names)
 int main(int argc, char* argv[])
 {
     QStringList arguments;
-    for (int i = 1; i < argc; ++i) {
+    for (int i = 1; i < argc; ++i)
         arguments.append(QString::fromLocal8Bit(argv[i]));
-    }
     const QString mode = arguments.value(0);
     const bool monkey = mode == QStringLiteral("--monkey");
     const bool digests = mode == QStringLiteral("--digest");
@@ -126,19 +119,16 @@ int main(int argc, char* argv[])
         return 2;
     }
     const QStringList names = arguments.mid(options);
-    if (qEnvironmentVariableIsEmpty("FONTCONFIG_FILE")) {
+    if (qEnvironmentVariableIsEmpty("FONTCONFIG_FILE"))
         qputenv("FONTCONFIG_FILE", TITLER_FONTS_CONF);
-    }
     std::unique_ptr<GalleryScreen> screen;
-    if (monkey || pictures) {
+    if (monkey || pictures)
         screen = std::make_unique<GalleryScreen>();
-    }
     QApplication application(argc, argv);
     Q_INIT_RESOURCE(TitlerToolResource);
     Q_INIT_RESOURCE(UILibrary);
     QApplication::setFont(QFont(QStringLiteral("KST"), 12));
-    if (monkey) {
+    if (monkey)
         return playMonkey(seed, count, names);
-    }
     return pictures ? shoot(QDir(arguments.at(1)), digests, names) : showPages(names);
 }

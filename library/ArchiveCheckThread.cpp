@@ -44,10 +44,9 @@ QSet<std::size_t> ArchiveCheckThread::takeUnreadable()
 QSet<std::size_t> ArchiveCheckThread::unreadableIn(std::size_t first, std::size_t count) const
 {
     QSet<std::size_t> found;
-    for (std::size_t row = first; row < first + count && !mCancelled; ++row) {
+    for (std::size_t row = first; row < first + count && !mCancelled; ++row)
         if (!mTitles->read(row))
             found.insert(row);
-    }
     return found;
 }
 

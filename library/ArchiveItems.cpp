@@ -29,10 +29,9 @@ Archive* ArchiveItems::own(std::unique_ptr<Archive> record)
 
 ArchiveItem* ArchiveItems::find(const QString& path) const
 {
-    for (ArchiveItem* item : mItems) {
+    for (ArchiveItem* item : mItems)
         if (item->getArchiveDataPath() == path)
             return item;
-    }
     return nullptr;
 }
 

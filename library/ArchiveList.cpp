@@ -334,10 +334,9 @@ void ArchiveList::giveBackItems()
 {
     mGiveBackRequested = false;
     std::vector<std::pair<int, ArchiveItem*>> made; // sorted by distance from the view
-    for (int i = 0; i < count(); ++i) {
+    for (int i = 0; i < count(); ++i)
         if (ArchiveItem* item = madeItem(i))
             made.emplace_back(qMax(firstVisibleItem() - i, i - lastVisibleItem()), item);
-    }
     std::sort(made.begin(), made.end());
     for (; static_cast<qsizetype>(made.size()) > ITEMS_KEPT; made.pop_back()) {
         ArchiveItem* item = made.back().second;

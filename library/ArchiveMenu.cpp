@@ -32,9 +32,8 @@ void ArchiveMenu::enableFor(bool onItem, bool hasCopy)
 
 ArchiveAction* ArchiveMenu::action(ArchiveAction::ARCHIVE_ACTION_TYPE type) const
 {
-    for (ArchiveAction* entry : mActions) {
+    for (ArchiveAction* entry : mActions)
         if (entry->getActionType() == type)
             return entry;
-    }
     return nullptr;
 }

@@ -107,10 +107,9 @@ void FolderEditor::drawFrame(QPainter& painter) const
 {
     const NineSlice::Triple places = NineSlice::row(rect(), mLeft.width(), mRight.width());
     const QPixmap* pieces[] = {&mLeft, &mCenter, &mRight};
-    for (size_t i = 0; i < places.size(); ++i) {
+    for (size_t i = 0; i < places.size(); ++i)
         if (!pieces[i]->isNull() && !places[i].isEmpty())
             painter.drawPixmap(places[i], *pieces[i]);
-    }
 }
 
 // Reports the end of the edit when the editor itself is hidden together with its row, but not when the dialog

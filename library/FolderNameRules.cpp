@@ -3,9 +3,8 @@
 bool FolderNameRules::isTooLong(const QString& name)
 {
     qsizetype characters = 0;
-    for (const QChar unit : name) {
+    for (const QChar unit : name)
         characters += unit.isLowSurrogate() ? 0 : 1;
-    }
     return characters > LONGEST_NAME;
 }
 

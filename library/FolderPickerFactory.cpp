@@ -67,10 +67,9 @@ void FolderPickerFactory::importSourceData()
         return;
     const QStringList names =
         QDir(mRootPath).entryList(QDir::Dirs | QDir::NoDotAndDotDot, QDir::Name | QDir::IgnoreCase);
-    for (const QString& name : names) {
+    for (const QString& name : names)
         if (mDisk.isTitleFolder(mRootPath, name))
             mFolders.append(folderOf(takeFolder(name)));
-    }
 }
 
 void* FolderPickerFactory::takeFolder(const QString& name)

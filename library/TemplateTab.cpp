@@ -135,10 +135,9 @@ QString TemplateTab::templateName(const Archive& archive)
 
 int TemplateTab::findTemplateIdFromName(const QString& name) const
 {
-    for (int id = 0; id < count(); ++id) {
+    for (int id = 0; id < count(); ++id)
         if (templateName(*archive(id)) == name)
             return id;
-    }
     return -1;
 }
 

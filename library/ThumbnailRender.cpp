@@ -37,10 +37,9 @@ const double RASTER_RATIO = 1.0;
 // Limits the bounding rectangles to the raster, so that a text far outside it takes no time to paint.
 void limitTextsToRaster(const QGraphicsScene& scene)
 {
-    for (QGraphicsItem* item : scene.items()) {
+    for (QGraphicsItem* item : scene.items())
         if (item->type() == GraphicsText::Type)
             static_cast<GraphicsText*>(item)->setBoundingRectFlag(true);
-    }
 }
 
 void logBoundingRect(const GraphicsText& text, int id)

@@ -85,10 +85,9 @@ void removeFiles(const Archive& archive, const std::string& stem)
 {
     for (const std::string& name :
          {archive.getThumbnailBig(), archive.getThumbnailMiddle(), archive.getThumbnailBlack(),
-          archive.getThumbnailSmall(), archive.getBgResource(), archive.getBgResourceBig()}) {
+          archive.getThumbnailSmall(), archive.getBgResource(), archive.getBgResourceBig()})
         if (name.starts_with(stem))
             QFile::remove(pictureOf(archive, name));
-    }
 }
 
 } // namespace

@@ -23,9 +23,8 @@ void UserTemplateMenu::translateText()
 
 ArchiveAction* UserTemplateMenu::action(ArchiveAction::ARCHIVE_ACTION_TYPE type) const
 {
-    for (ArchiveAction* entry : mActions) {
+    for (ArchiveAction* entry : mActions)
         if (entry->getActionType() == type)
             return entry;
-    }
     return nullptr;
 }

@@ -129,10 +129,9 @@ void FontCombox::registerFontFile(const QString& path)
     const int id = QFontDatabase::addApplicationFont(path);
     if (id < 0)
         return;
-    for (const QString& family : QFontDatabase::applicationFontFamilies(id)) {
+    for (const QString& family : QFontDatabase::applicationFontFamilies(id))
         if (!m_imported.contains(family))
             m_imported.append(family);
-    }
 }
 
 void FontCombox::setFontFamily(const QString& family)

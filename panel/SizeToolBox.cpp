@@ -346,11 +346,10 @@ void SizeToolBox::editingLeft()
     // field and overwrites it.
     const bool wasValid = m_state != State::Invalid;
     m_state = State::Shown;
-    if (wasValid && m_edit->hasAcceptableInput()) {
+    if (wasValid && m_edit->hasAcceptableInput())
         showText(m_lastValidText);
-    } else {
+    else
         resetLastValidTextAndShowWarning();
-    }
     leaveEditing();
 }
 

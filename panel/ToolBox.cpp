@@ -184,11 +184,10 @@ void ToolBox::showIcon(Button& entry)
         return;
     const KSPushbutton::_enumButtonState state = entry.button->buttonState();
     QString name = entry.icon;
-    if (state == KSPushbutton::ButtonDisabled || state == KSPushbutton::ButtonSelectedDisabled) {
+    if (state == KSPushbutton::ButtonDisabled || state == KSPushbutton::ButtonSelectedDisabled)
         name += QLatin1String(DISABLED_SUFFIX);
-    } else if (entry.button->isSelected()) {
+    else if (entry.button->isSelected())
         name += QLatin1String(SELECTED_SUFFIX);
-    }
     if (name == entry.shownIcon)
         return;
     entry.shownIcon = name;

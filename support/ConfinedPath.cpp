@@ -73,10 +73,9 @@ bool isPrefix(const std::string& folder, const std::string& path)
 
 bool isBelowTitleRoots(const std::string& path)
 {
-    for (const FolderLookup::Getter root : TITLE_ROOTS) {
+    for (const FolderLookup::Getter root : TITLE_ROOTS)
         if (ConfinedPath::isBelow(root, path))
             return true;
-    }
     return false;
 }
 

@@ -69,18 +69,15 @@ std::string problem()
         return "the data path " + quoted(path) + " is too long: " + length + " bytes, and at most " +
                std::to_string(MAX_LENGTH) + " are possible";
     }
-    if (path.empty() || path.front() != '/') {
+    if (path.empty() || path.front() != '/')
         return "the data path " + quoted(path) + " is not absolute";
-    }
     const std::string folder = wideToMultiByte(PathManagerEx().getDefaultPath());
-    if (folder.empty() || folder.front() != '/') {
+    if (folder.empty() || folder.front() != '/')
         return std::string(); // relative to the working directory; not checked
-    }
     boost::system::error_code error;
     boost::filesystem::create_directories(folder, error);
-    if (error) {
+    if (error)
         return unwritable(path, error.message());
-    }
     const int refusal = writeError(folder);
     return refusal == 0 ? std::string() : unwritable(path, std::strerror(refusal));
 }

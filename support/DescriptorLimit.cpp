@@ -10,9 +10,8 @@ namespace DescriptorLimit
 void raise()
 {
     rlimit limit{};
-    if (getrlimit(RLIMIT_NOFILE, &limit) != 0 || limit.rlim_cur >= WANTED) {
+    if (getrlimit(RLIMIT_NOFILE, &limit) != 0 || limit.rlim_cur >= WANTED)
         return;
-    }
     limit.rlim_cur = std::min<rlim_t>(WANTED, limit.rlim_max);
     setrlimit(RLIMIT_NOFILE, &limit);
 }

@@ -71,14 +71,13 @@ std::string HiddenName::kept(const std::string& path)
     const std::size_t slash = path.rfind('/');
     const std::string_view base = std::string_view(path).substr(slash == std::string::npos ? 0 : slash + 1);
     std::string name(KEPT_PREFIX);
-    for (const char c : base) {
+    for (const char c : base)
         if (c == '.')
             name += "%2E";
         else if (c == '%')
             name += "%25";
         else
             name += c;
-    }
     return name.size() > NAME_MAX ? std::string() : folderOf(path) + '/' + name;
 }
 

@@ -13,9 +13,8 @@ locale_t openTextLocale()
 {
     locale_t fromEnvironment = newlocale(LC_CTYPE_MASK, "", nullptr);
     if (fromEnvironment != nullptr) {
-        if (std::strcmp(nl_langinfo_l(CODESET, fromEnvironment), "UTF-8") == 0) {
+        if (std::strcmp(nl_langinfo_l(CODESET, fromEnvironment), "UTF-8") == 0)
             return fromEnvironment;
-        }
         freelocale(fromEnvironment);
     }
     return newlocale(LC_CTYPE_MASK, "C.UTF-8", nullptr);
@@ -48,13 +47,11 @@ std::string wideToMultiByte(const std::wstring& text)
     std::mbstate_t state{};
     char bytes[16];
     for (const wchar_t character : text) {
-        if (character == L'\0') {
+        if (character == L'\0')
             break;
-        }
         const std::size_t count = std::wcrtomb(bytes, character, &state);
-        if (count == static_cast<std::size_t>(-1)) {
+        if (count == static_cast<std::size_t>(-1))
             break;
-        }
         result.append(bytes, count);
     }
     return result;
@@ -63,17 +60,15 @@ std::string wideToMultiByte(const std::wstring& text)
 std::wstring multiByteToWide(const char* text, std::size_t length)
 {
     std::wstring result;
-    if (text == nullptr) {
+    if (text == nullptr)
         return result;
-    }
     const TextLocaleScope scope;
     std::mbstate_t state{};
     while (length > 0) {
         wchar_t character = L'\0';
         const std::size_t count = std::mbrtowc(&character, text, length, &state);
-        if (count == 0 || count > length) { // a NUL, an invalid or an incomplete sequence
+        if (count == 0 || count > length) // a NUL, an invalid or an incomplete sequence
             break;
-        }
         result.push_back(character);
         text += count;
         length -= count;

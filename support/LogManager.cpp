@@ -32,9 +32,8 @@ std::wstring gProcName;
 std::string logFolder()
 {
     char folder[PATH_MAX];
-    if (k2sys_log_dir(folder, sizeof folder) < 0) {
+    if (k2sys_log_dir(folder, sizeof folder) < 0)
         return "/var/log";
-    }
     return folder;
 }
 
@@ -95,9 +94,8 @@ std::string withoutConversions(const std::string& text)
     std::string result;
     for (const char c : text) {
         result += c;
-        if (c == '%') {
+        if (c == '%')
             result += c;
-        }
     }
     return result;
 }
@@ -105,9 +103,8 @@ std::string withoutConversions(const std::string& text)
 // Cuts a format to size bytes including its NUL, without leaving an incomplete conversion at the end.
 std::string cutFormat(const std::string& format, std::size_t size)
 {
-    if (format.size() < size) {
+    if (format.size() < size)
         return format;
-    }
     std::string cut = format.substr(0, size - 1);
     std::size_t at = 0;
     while ((at = cut.find('%', at)) != std::string::npos) {
@@ -137,9 +134,8 @@ void UNINIT_LOGGING()
 
 void LOG_EVENT(std::wstring module, int line, std::wstring text, int priority)
 {
-    if (gLogManager != nullptr) {
+    if (gLogManager != nullptr)
         gLogManager->logEvent(std::move(module), line, std::move(text), priority);
-    }
 }
 
 void LOG_EVENT(std::string module, int line, std::string text, int priority)
@@ -149,23 +145,20 @@ void LOG_EVENT(std::string module, int line, std::string text, int priority)
 
 void LOG_USER_OPERATE(std::wstring area, int number, std::wstring text)
 {
-    if (gLogManager != nullptr) {
+    if (gLogManager != nullptr)
         gLogManager->logUserOperate(std::move(area), number, std::move(text));
-    }
 }
 
 void LOG_DEBUG_OPERATE(std::wstring area, int number, std::wstring text)
 {
-    if (gLogManager != nullptr) {
+    if (gLogManager != nullptr)
         gLogManager->logDebugOperate(std::move(area), number, std::move(text));
-    }
 }
 
 LogManager* LogManager::getInstance()
 {
-    if (mpLogManager == nullptr) {
+    if (mpLogManager == nullptr)
         mpLogManager = new LogManager();
-    }
     return mpLogManager;
 }
 
@@ -203,18 +196,16 @@ void LogManager::logEvent(int priority, const char* module, int line, const char
 
 void LogManager::putLog(FILE* file, const char* module, int line, const char* format, va_list args)
 {
-    if (file == nullptr) {
+    if (file == nullptr)
         return;
-    }
     char number[16];
     std::snprintf(number, sizeof number, "] %03d: ", line);
     const std::string whole = getCurrentTime() + " localhost " + withoutConversions(m_processName) + "[" +
                               std::to_string(getpid()) + "]: [" + withoutConversions(module) + number +
                               format;
     const std::string text = formatted(cutFormat(whole, LINE_FORMAT_SIZE - 1).c_str(), args);
-    if (std::fprintf(file, "%s\n", lineText(multiByteToWide(text)).c_str()) >= 0) {
+    if (std::fprintf(file, "%s\n", lineText(multiByteToWide(text)).c_str()) >= 0)
         std::fflush(file);
-    }
 }
 
 void LogManager::logUserOperate(std::wstring area, int line, std::wstring text)
@@ -245,13 +236,11 @@ std::string LogManager::getCurrentTime()
 std::string LogManager::formatTime(const timeval& moment)
 {
     tm local{};
-    if (localtime_r(&moment.tv_sec, &local) == nullptr) {
+    if (localtime_r(&moment.tv_sec, &local) == nullptr)
         return std::string();
-    }
     char date[64];
-    if (std::strftime(date, sizeof date, "%FT%T", &local) == 0) {
+    if (std::strftime(date, sizeof date, "%FT%T", &local) == 0)
         return std::string();
-    }
     const int offset = static_cast<int>(local.tm_gmtoff);
     char stamp[128];
     std::snprintf(stamp, sizeof stamp, "%s.%06ld%+03d:%02d", date, static_cast<long>(moment.tv_usec),

@@ -69,10 +69,9 @@ void rebase(std::string& path, const Rename& rename)
 
 void followRenames(std::string& path)
 {
-    for (const Rename& rename : gRenames) {
+    for (const Rename& rename : gRenames)
         if (isBelow(path, rename.before) && !exists(HiddenName::folderOf(path)))
             rebase(path, rename);
-    }
 }
 
 std::vector<Entry>::iterator entryOf(const std::string& path)

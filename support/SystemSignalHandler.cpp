@@ -64,32 +64,27 @@ const char** allocateTable()
 
 const char* textOf(int number)
 {
-    for (const SignalText* entry = SIGNALS; entry->number != 0; ++entry) {
-        if (entry->number == number) {
+    for (const SignalText* entry = SIGNALS; entry->number != 0; ++entry)
+        if (entry->number == number)
             return entry->text;
-        }
-    }
     return nullptr;
 }
 
 void callBack()
 {
-    if (void (*function)() = g_pCallBackFun.load()) {
+    if (void (*function)() = g_pCallBackFun.load())
         function();
-    }
 }
 
 // Termination requests do blocking work, which is not allowed in a signal handler; a pipe passes them to the
 // event loop.
 void createWakeUpPipe()
 {
-    if (QCoreApplication::instance() == nullptr || g_wakeUpWriteEnd.load() != -1) {
+    if (QCoreApplication::instance() == nullptr || g_wakeUpWriteEnd.load() != -1)
         return;
-    }
     int ends[2];
-    if (pipe2(ends, O_CLOEXEC | O_NONBLOCK) != 0) {
+    if (pipe2(ends, O_CLOEXEC | O_NONBLOCK) != 0)
         return;
-    }
     auto* notifier = new QSocketNotifier(ends[0], QSocketNotifier::Read, QCoreApplication::instance());
     QObject::connect(notifier, &QSocketNotifier::activated, notifier, [readEnd = ends[0]] {
         char bytes[64];
@@ -147,9 +142,8 @@ void trace()
 {
     limitTraceTime();
     k2sys_print_backtrace();
-    if (const char** table = g_SignalMsgTable.exchange(nullptr)) {
+    if (const char** table = g_SignalMsgTable.exchange(nullptr))
         munmap(table, TABLE_BYTES);
-    }
     g_bIsInited.store(false);
 }
 
@@ -158,9 +152,8 @@ void traceAndAbort()
     trace();
     struct sigaction action {
     };
-    if (sigaction(SIGABRT, nullptr, &action) == 0 && action.sa_handler == handleSignal) {
+    if (sigaction(SIGABRT, nullptr, &action) == 0 && action.sa_handler == handleSignal)
         setDefaultAction(SIGABRT); // one trace is enough
-    }
     std::abort();
 }
 
@@ -180,17 +173,15 @@ void registerSystemSignalHandler(void (*callback)(), char const* processName)
     g_strProcessName = processName != nullptr ? processName : "";
     createWakeUpPipe();
     AlternateStack::useInThisThread();
-    if (g_bIsInited.load()) {
+    if (g_bIsInited.load())
         return;
-    }
     const char** table = allocateTable();
     if (table == nullptr) {
         k2sys_syslog(3, "%s: %s", "malloc", std::strerror(errno));
         return;
     }
-    for (int number = 0; number < TABLE_ENTRIES; ++number) {
+    for (int number = 0; number < TABLE_ENTRIES; ++number)
         table[number] = textOf(number);
-    }
     g_SignalMsgTable.store(table);
     for (const SignalText* entry = SIGNALS; entry->number != 0; ++entry) {
         struct sigaction action {
@@ -210,9 +201,8 @@ bool isTerminationRequested()
 
 void handleSignal(int signalNumber)
 {
-    if (signalNumber > LAST_HANDLED_SIGNAL) {
+    if (signalNumber > LAST_HANDLED_SIGNAL)
         return;
-    }
     switch (signalNumber) {
     case SIGQUIT:
     case SIGBUS:

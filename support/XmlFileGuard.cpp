@@ -50,14 +50,13 @@ private:
     // TinyXML skips byte order marks and the non-characters U+FFFE and U+FFFF like white space.
     void skipSpace()
     {
-        for (;;) {
+        for (;;)
             if (mPos != mEnd && isSpace(*mPos))
                 ++mPos;
             else if (startsWith("\xEF\xBB\xBF") || startsWith("\xEF\xBF\xBE") || startsWith("\xEF\xBF\xBF"))
                 mPos += 3;
             else
                 return;
-        }
     }
 
     bool startsWithIgnoringCase(std::string_view lowerCaseTag) const

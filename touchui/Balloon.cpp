@@ -55,9 +55,8 @@ void Balloon::showPromptText(QWidget* widget, const QString& text, int milliseco
 {
     m_timer->stop();
     show(widget, text, Qt::AlignLeft | Qt::AlignVCenter | Qt::TextWordWrap, false);
-    if (isVisible() && milliseconds > 0) {
+    if (isVisible() && milliseconds > 0)
         m_timer->start(milliseconds);
-    }
 }
 
 void Balloon::show(QWidget* widget, const QString& text, int flags, bool below)
@@ -78,11 +77,10 @@ void Balloon::show(QWidget* widget, const QString& text, int flags, bool below)
     m_below = below;
     const QRect bounds = BalloonWindow::bounds(s_ParentWindow, widget->mapToGlobal(QPoint(0, 0)));
     int room = bounds.width() - 2 * MARGIN_X;
-    if (flags & Qt::TextWordWrap) {
+    if (flags & Qt::TextWordWrap)
         room = qMin(room, WIDEST_PROMPT);
-    } else {
+    else
         m_text = QFontMetrics(textFont()).elidedText(text, Qt::ElideRight, room);
-    }
     setTextRect(calculateTextRect(m_text, room, flags));
     designballon(widget);
 }
@@ -109,11 +107,10 @@ void Balloon::designballon(QWidget* widget)
     picture.fill(Qt::transparent);
     {
         QPainter painter(&picture);
-        if (m_placement.side == MenuPlacement::ArrowSide::Top) {
+        if (m_placement.side == MenuPlacement::ArrowSide::Top)
             paintTopArrowBalloon(painter);
-        } else {
+        else
             paintBottomBalloon(painter);
-        }
         painter.setFont(textFont());
         painter.setPen(TEXT_COLOR);
         painter.drawText(m_textRect.translated(m_body.topLeft()), m_textFlags, m_text);
@@ -173,9 +170,8 @@ void Balloon::drawBottomArrowBottomImage(QPainter& painter) const
 void Balloon::hide()
 {
     m_timer->stop();
-    if (m_window != nullptr) {
+    if (m_window != nullptr)
         m_window->hide();
-    }
 }
 
 bool Balloon::isVisible() const
@@ -190,11 +186,10 @@ QRect Balloon::geometry() const
 
 bool Balloon::eventFilter(QObject* obj, QEvent* event)
 {
-    if (obj == m_anchor && event->type() == QEvent::Hide) {
+    if (obj == m_anchor && event->type() == QEvent::Hide)
         hide();
-    } else if (obj == m_anchor && (event->type() == QEvent::Move || event->type() == QEvent::Resize) &&
-               isVisible()) {
+    else if (obj == m_anchor && (event->type() == QEvent::Move || event->type() == QEvent::Resize) &&
+             isVisible())
         designballon(m_anchor);
-    }
     return QObject::eventFilter(obj, event);
 }

@@ -29,13 +29,11 @@ void BalloonWindow::showPicture(const QPixmap& picture, const QPoint& globalPosi
 
 QRect BalloonWindow::bounds(const QWidget* window, const QPoint& globalPoint)
 {
-    if (window != nullptr) {
+    if (window != nullptr)
         return QRect(window->mapToGlobal(QPoint(0, 0)), window->size());
-    }
     const QScreen* screen = QGuiApplication::screenAt(globalPoint);
-    if (screen == nullptr) {
+    if (screen == nullptr)
         screen = QGuiApplication::primaryScreen();
-    }
     return screen != nullptr ? screen->geometry() : QRect();
 }
 

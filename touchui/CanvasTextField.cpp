@@ -13,13 +13,11 @@ QGraphicsTextItem* CanvasTextField::editedText(const QGraphicsView& view)
 {
     const QList<QGraphicsItem*> items = view.items();
     for (QGraphicsItem* item : items) {
-        if (item->type() != ITEM_TYPE || item->parentItem() == nullptr || !item->isEnabled()) {
+        if (item->type() != ITEM_TYPE || item->parentItem() == nullptr || !item->isEnabled())
             continue;
-        }
         auto* text = qobject_cast<QGraphicsTextItem*>(item->toGraphicsObject());
-        if (text != nullptr && text->textInteractionFlags() == Qt::TextEditorInteraction) {
+        if (text != nullptr && text->textInteractionFlags() == Qt::TextEditorInteraction)
             return text;
-        }
     }
     return nullptr;
 }
@@ -27,9 +25,8 @@ QGraphicsTextItem* CanvasTextField::editedText(const QGraphicsView& view)
 SubCommonDefine::tagSoftKeyBoardInitData CanvasTextField::describe() const
 {
     SubCommonDefine::tagSoftKeyBoardInitData data;
-    if (const QGraphicsTextItem* text = editedText(m_view)) {
+    if (const QGraphicsTextItem* text = editedText(m_view))
         FieldName::read(text->objectName(), data);
-    }
     return data;
 }
 

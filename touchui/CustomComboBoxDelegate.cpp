@@ -18,9 +18,8 @@ const QColor SWATCH_BORDER(18, 18, 18);
 
 QColor asColor(const QVariant& value)
 {
-    if (value.userType() == QMetaType::QBrush) {
+    if (value.userType() == QMetaType::QBrush)
         return value.value<QBrush>().color();
-    }
     return value.userType() == QMetaType::QColor ? value.value<QColor>() : QColor();
 }
 
@@ -34,14 +33,12 @@ CustomComboBoxDelegate::CustomComboBoxDelegate(QObject* parent)
 QColor CustomComboBoxDelegate::rowColor(const QModelIndex& index)
 {
     QColor color = asColor(index.data(Qt::BackgroundRole));
-    if (!color.isValid()) {
+    if (!color.isValid())
         color = asColor(index.data(Qt::DecorationRole));
-    }
     if (!color.isValid()) {
         const QString text = index.data(Qt::DisplayRole).toString();
-        if (QColor::isValidColor(text)) {
+        if (QColor::isValidColor(text))
             color.setNamedColor(text);
-        }
     }
     return color;
 }

@@ -86,27 +86,23 @@ void CustomComboBoxView::pressAt(const QPoint& position)
 
 void CustomComboBoxView::moveTo(const QPoint& position)
 {
-    if (!m_flicker.isFollowing()) {
+    if (!m_flicker.isFollowing())
         return;
-    }
     m_flicker.follow(position);
-    if (hasFlicked() || FlickMotion::isBeyondSlop(m_pressPoint, position, FlickMotion::TOUCH_SLOP)) {
+    if (hasFlicked() || FlickMotion::isBeyondSlop(m_pressPoint, position, FlickMotion::TOUCH_SLOP))
         setPressedIndex(QModelIndex());
-    }
 }
 
 void CustomComboBoxView::releaseAt(const QPoint& position)
 {
-    if (!m_flicker.isFollowing()) {
+    if (!m_flicker.isFollowing())
         return;
-    }
     m_flicker.lift(position);
     const QModelIndex tapped = m_pressedIndex;
     setPressedIndex(QModelIndex());
     if (!isAutoFilck() && !hasFlicked() && tapped.isValid() && indexAt(position) == tapped &&
-        (tapped.flags() & Qt::ItemIsEnabled)) {
+        (tapped.flags() & Qt::ItemIsEnabled))
         Q_EMIT signalTapped(tapped);
-    }
 }
 
 void CustomComboBoxView::cancelTouch()
@@ -134,9 +130,8 @@ void CustomComboBoxView::changeScrollBarValue(int offset)
 
 void CustomComboBoxView::showLastRowWhole()
 {
-    if (verticalScrollBar()->value() == verticalScrollBar()->maximum()) {
+    if (verticalScrollBar()->value() == verticalScrollBar()->maximum())
         scrollToBottom();
-    }
 }
 
 bool CustomComboBoxView::viewportEvent(QEvent* event)
@@ -163,19 +158,16 @@ bool CustomComboBoxView::viewportMouseEvent(QEvent* event)
 {
     const auto* mouse = static_cast<QMouseEvent*>(event);
     const QPoint position = mouse->position().toPoint();
-    if (m_finger.isDown()) {
+    if (m_finger.isDown())
         return true; // a finger is using the list
-    }
     if (event->type() == QEvent::MouseMove) {
-        if (mouse->buttons() & Qt::LeftButton) {
+        if (mouse->buttons() & Qt::LeftButton)
             moveTo(position);
-        }
     } else if (mouse->button() == Qt::LeftButton) {
-        if (event->type() == QEvent::MouseButtonRelease) {
+        if (event->type() == QEvent::MouseButtonRelease)
             releaseAt(position);
-        } else {
+        else
             pressAt(position);
-        }
     }
     return true;
 }
@@ -191,17 +183,15 @@ void CustomComboBoxView::setPressedIndex(const QModelIndex& index)
 void CustomComboBoxView::paintEvent(QPaintEvent* event)
 {
     QListView::paintEvent(event);
-    if (model() == nullptr) {
+    if (model() == nullptr)
         return;
-    }
     QPainter painter(viewport());
     const int last = model()->rowCount(rootIndex()) - 1;
     const QModelIndex first = indexAt(QPoint(0, 0));
     for (int row = first.isValid() ? first.row() : 0; row < last; ++row) {
         const QRect rect = visualRect(model()->index(row, modelColumn(), rootIndex()));
-        if (rect.top() > viewport()->height()) {
+        if (rect.top() > viewport()->height())
             break;
-        }
         drawSeparator(painter, rect);
     }
 }

@@ -35,13 +35,11 @@ QWidget* CustomTreeDelegete::createEditor(QWidget* parent, const QStyleOptionVie
                                           const QModelIndex& index) const
 {
     KSTreeModel* model = m_view->treeModel();
-    if (model == nullptr || model->factory() == nullptr) {
+    if (model == nullptr || model->factory() == nullptr)
         return nullptr;
-    }
     QWidget* editor = model->factory()->createControl(parent, KSModelDataFactory::LineEditControl, index);
-    if (auto* line = qobject_cast<QLineEdit*>(editor)) {
+    if (auto* line = qobject_cast<QLineEdit*>(editor))
         Q_EMIT signalLineEditInitialize(line, index);
-    }
     return editor;
 }
 
@@ -50,9 +48,8 @@ void CustomTreeDelegete::setEditorData(QWidget* editor, const QModelIndex& index
     if (auto* line = qobject_cast<QLineEdit*>(editor)) {
         const QString text = index.data(Qt::EditRole).toString();
         // Data of the row can change while its name is being edited.
-        if (!line->isModified() && line->text() != text) {
+        if (!line->isModified() && line->text() != text)
             line->setText(text);
-        }
     } else {
         QStyledItemDelegate::setEditorData(editor, index);
     }
@@ -82,8 +79,7 @@ void CustomTreeDelegete::updateEditorGeometry(QWidget* editor, const QStyleOptio
 bool CustomTreeDelegete::eventFilter(QObject* object, QEvent* event)
 {
     const KSTreeModel* model = m_view->treeModel();
-    if (model != nullptr && model->factory() != nullptr && model->factory()->isControlSelfEnding()) {
+    if (model != nullptr && model->factory() != nullptr && model->factory()->isControlSelfEnding())
         return false;
-    }
     return QStyledItemDelegate::eventFilter(object, event);
 }

@@ -34,7 +34,6 @@ void ElidedTextTip::hide()
 
 void ElidedTextTip::restartIfActive()
 {
-    if (m_timer.isActive()) {
+    if (m_timer.isActive())
         m_timer.start();
-    }
 }

@@ -16,9 +16,8 @@ void setNumber(int& field, const QString& text)
 {
     bool ok = false;
     const int number = text.toInt(&ok);
-    if (ok) {
+    if (ok)
         field = number;
-    }
 }
 
 } // namespace
@@ -60,9 +59,8 @@ void FieldName::read(const QString& name, tagSoftKeyBoardInitData& data)
 void FieldName::readShort(const QString& name, tagSoftKeyBoardInitData& data)
 {
     const QStringList parts = name.split(SEPARATOR);
-    if (parts.size() < 2) {
+    if (parts.size() < 2)
         return;
-    }
     setNumber(data.keyboardType, parts.at(0));
     data.title = parts.at(1).toStdWString();
     if (parts.size() == 3) {

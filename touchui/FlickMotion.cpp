@@ -101,10 +101,9 @@ int dropIndex(std::span<const int> candidateTops, int firstIndex, int itemCount,
 {
     if (itemCount <= 0)
         return 0;
-    for (std::size_t i = 0; i < candidateTops.size(); ++i) {
+    for (std::size_t i = 0; i < candidateTops.size(); ++i)
         if (candidateTops[i] >= liftedTop)
             return firstIndex + int(i);
-    }
     const bool past = !candidateTops.empty() && firstIndex + int(candidateTops.size()) == itemCount;
     return past ? itemCount : oldIndex;
 }

@@ -23,12 +23,10 @@ void Flicker::begin(const QPointF& position)
 
 void Flicker::follow(const QPointF& position)
 {
-    if (!m_following) {
+    if (!m_following)
         return;
-    }
-    if (m_pendingStart) {
+    if (m_pendingStart)
         setStart(position);
-    }
     m_pendingStart = false;
     m_current = position;
     setEnd(position);
@@ -36,16 +34,14 @@ void Flicker::follow(const QPointF& position)
 
 void Flicker::lift(const QPointF& position)
 {
-    if (!m_following) {
+    if (!m_following)
         return;
-    }
     m_following = false;
     setEnd(position);
-    if (m_able && !isEnd() && !m_bounded) {
+    if (m_able && !isEnd() && !m_bounded)
         m_gliding = true;
-    } else {
+    else
         stop();
-    }
 }
 
 void Flicker::cancel()
@@ -64,13 +60,11 @@ void Flicker::setStart(const QPointF& point)
 
 void Flicker::setEnd(const QPointF& point)
 {
-    if (!m_able) {
+    if (!m_able)
         return;
-    }
     m_end = point;
-    if (isEnd() || isRunning()) {
+    if (isEnd() || isRunning())
         return;
-    }
     m_timer.start(m_rules.interval);
     m_hasFlicked = true;
     Q_EMIT started();
@@ -79,9 +73,8 @@ void Flicker::setEnd(const QPointF& point)
 void Flicker::setAble(bool able)
 {
     m_able = able;
-    if (!able) {
+    if (!able)
         stop();
-    }
 }
 
 void Flicker::stop()
@@ -119,9 +112,8 @@ void Flicker::tick()
         return;
     }
     Q_EMIT ticked();
-    if ((m_gliding || m_rules.dragStopsAtLimit) && isAtLimit()) {
+    if ((m_gliding || m_rules.dragStopsAtLimit) && isAtLimit())
         end(End::Limit);
-    }
 }
 
 void Flicker::end(End end)

@@ -13,9 +13,8 @@ ITitlerAPPEventFilterController::ITitlerAPPEventFilterController(QObject* parent
 
 ITitlerAPPEventFilterController::~ITitlerAPPEventFilterController()
 {
-    if (gInstance == this) {
+    if (gInstance == this)
         gInstance = nullptr;
-    }
 }
 
 ITitlerAPPEventFilterController* ITitlerAPPEventFilterController::getInstance()

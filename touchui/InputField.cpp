@@ -10,16 +10,13 @@
 
 std::unique_ptr<InputField> InputField::of(QWidget* widget)
 {
-    if (auto* view = qobject_cast<QGraphicsView*>(widget)) {
+    if (auto* view = qobject_cast<QGraphicsView*>(widget))
         return std::make_unique<CanvasTextField>(*view);
-    }
-    if (auto* edit = qobject_cast<QLineEdit*>(widget)) {
+    if (auto* edit = qobject_cast<QLineEdit*>(widget))
         return std::make_unique<LineEditField>(*edit);
-    }
     auto* box = qobject_cast<QComboBox*>(widget);
-    if (box != nullptr && box->lineEdit() != nullptr) {
+    if (box != nullptr && box->lineEdit() != nullptr)
         return std::make_unique<ComboBoxField>(*box);
-    }
     return nullptr;
 }
 

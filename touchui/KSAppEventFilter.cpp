@@ -59,9 +59,8 @@ KSAppEventFilter::KSAppEventFilter(QObject* parent) : QObject(parent)
 
 KSAppEventFilter::~KSAppEventFilter()
 {
-    if (gCurrent == this) {
+    if (gCurrent == this)
         gCurrent = nullptr;
-    }
     qDeleteAll(m_owned);
 }
 
@@ -73,9 +72,8 @@ bool KSAppEventFilter::eventFilter(QObject* obj, QEvent* event)
         doEventFilter(obj, event) || (!m_eventFilters.isEmpty() && notifyRegEventFilter(obj, event));
     if (event->type() == QEvent::TouchEnd && isTouched(obj)) {
         forgetTouch(obj);
-        if (swallowed) {
+        if (swallowed)
             OneFinger::cancelTouchOf(obj);
-        }
     }
     return swallowed;
 }
@@ -84,16 +82,14 @@ bool KSAppEventFilter::doEventFilter(QObject* obj, QEvent* event)
 {
     switch (event->type()) {
     case QEvent::MouseButtonPress:
-        if (!obj->isWindowType()) {
+        if (!obj->isWindowType())
             Q_EMIT signalEventBegin();
-        }
         return false;
     case QEvent::KeyPress:
         return onKeyPress(obj, event);
     case QEvent::TouchBegin:
-        if (obj->isWindowType()) {
+        if (obj->isWindowType())
             return false;
-        }
         Q_EMIT signalEventBegin();
         return !isEnable(obj) || doLock(obj, event) != 0;
     case QEvent::TouchUpdate:
@@ -112,9 +108,8 @@ bool KSAppEventFilter::doEventFilter(QObject* obj, QEvent* event)
         // After a TouchCancel, no TouchEnd follows.
         noticeAcceptedTouch(obj);
         forgetTouch(obj);
-        if (isLock(obj, LOCKMETHOD_TOUCH)) {
+        if (isLock(obj, LOCKMETHOD_TOUCH))
             tryUnlock(obj, LOCKMETHOD_TOUCH);
-        }
         return false;
     case QEvent::EnabledChange:
         cancelTouchWhenDisabled(obj);
@@ -123,9 +118,8 @@ bool KSAppEventFilter::doEventFilter(QObject* obj, QEvent* event)
         cancelTouchWhenHidden(obj);
         return false;
     case QEvent::WindowBlocked:
-        if (obj->isWidgetType()) {
+        if (obj->isWidgetType())
             cancelTouches(static_cast<const QWidget*>(obj));
-        }
         return false;
     case QEvent::Gesture:
         return true; // gestures are not used
@@ -136,15 +130,13 @@ bool KSAppEventFilter::doEventFilter(QObject* obj, QEvent* event)
 
 bool KSAppEventFilter::notifyRegEventFilter(QObject* obj, QEvent* event)
 {
-    if (obj->isWindowType()) {
+    if (obj->isWindowType())
         return false;
-    }
     // Iterates by index, because a filter may unregister or be deleted during the call.
     for (qsizetype i = 0; i < m_eventFilters.size();) {
         QObject* const asked = m_eventFilters.at(i);
-        if (asked->eventFilter(obj, event)) {
+        if (asked->eventFilter(obj, event))
             return true;
-        }
         const qsizetype place = m_eventFilters.indexOf(asked);
         i = place < 0 ? i : place + 1;
     }
@@ -160,9 +152,8 @@ bool KSAppEventFilter::isEnable(QObject* obj)
 bool KSAppEventFilter::onKeyPress(QObject*, QEvent* event)
 {
     KSInputContext* context = KSInputContext::instance();
-    if (context == nullptr || KSInputContext::isSoftKeyboardClosed() || context->isSendingKeyEvent()) {
+    if (context == nullptr || KSInputContext::isSoftKeyboardClosed() || context->isSendingKeyEvent())
         return false;
-    }
     return context->forwardKeyPress(event);
 }
 
@@ -196,9 +187,8 @@ int KSAppEventFilter::doLockTouchBegin(QObject* obj, QEvent* event)
             }
         }
     }
-    if (result == 0) {
+    if (result == 0)
         watchTouch(obj);
-    }
     if (result == 0 && pointCount(event) > 0) {
         m_begun = obj;
         m_begunId = static_cast<const QTouchEvent*>(event)->points().constFirst().id();
@@ -214,16 +204,13 @@ int KSAppEventFilter::doLockTouchBegin(QObject* obj, QEvent* event)
 // receives neither updates nor the end. Its lock is released when the finger is lifted from the window.
 void KSAppEventFilter::watchIgnoredTouch(QEvent* event)
 {
-    if (m_begun == nullptr) {
+    if (m_begun == nullptr)
         return;
-    }
     bool lifted = event->type() == QEvent::TouchCancel;
-    for (const QEventPoint& point : static_cast<QTouchEvent*>(event)->points()) {
+    for (const QEventPoint& point : static_cast<QTouchEvent*>(event)->points())
         lifted = lifted || (point.id() == m_begunId && point.state() == QEventPoint::State::Released);
-    }
-    if (!lifted) {
+    if (!lifted)
         return;
-    }
     // Queued until the widgets have handled this event, which shows whether one of them has accepted the
     // begin.
     const auto release = [this, obj = m_begun, id = m_begunId] {
@@ -237,9 +224,8 @@ void KSAppEventFilter::watchIgnoredTouch(QEvent* event)
 
 void KSAppEventFilter::noticeAcceptedTouch(const QObject* obj)
 {
-    if (obj == m_begun) {
+    if (obj == m_begun)
         m_begun.clear();
-    }
 }
 
 bool KSAppEventFilter::isTouched(QObject* obj) const
@@ -257,17 +243,15 @@ void KSAppEventFilter::watchTouch(QObject* obj)
 
 void KSAppEventFilter::forgetTouch(QObject* obj)
 {
-    if (m_touched.removeAll(obj) > 0) {
+    if (m_touched.removeAll(obj) > 0)
         disconnect(obj, &QObject::destroyed, this, &KSAppEventFilter::touchedObjectDestroyed);
-    }
 }
 
 void KSAppEventFilter::touchedObjectDestroyed(QObject* obj)
 {
     m_touched.removeAll(obj);
-    if (isLock(obj, LOCKMETHOD_TOUCH)) {
+    if (isLock(obj, LOCKMETHOD_TOUCH))
         tryUnlock(obj, LOCKMETHOD_TOUCH);
-    }
 }
 
 // Works on a copy, because each cancelled object may destroy others or start a new touch.
@@ -275,35 +259,30 @@ void KSAppEventFilter::cancelTouches(const QWidget* window)
 {
     const QList<QPointer<QObject>> touched(m_touched.cbegin(), m_touched.cend());
     for (const QPointer<QObject>& obj : touched) {
-        if (obj == nullptr || !isTouched(obj)) {
+        if (obj == nullptr || !isTouched(obj))
             continue;
-        }
         const auto* widget = qobject_cast<const QWidget*>(obj.data());
-        if (window == nullptr || (widget != nullptr && widget->window() == window)) {
+        if (window == nullptr || (widget != nullptr && widget->window() == window))
             OneFinger::cancelTouchOf(obj);
-        }
     }
 }
 
 void KSAppEventFilter::cancelTouchWhenDisabled(QObject* obj)
 {
-    if (isTouched(obj) && !isEnable(obj)) {
+    if (isTouched(obj) && !isEnable(obj))
         OneFinger::cancelTouchOf(obj);
-    }
 }
 
 // A child that was hidden explicitly keeps its touch; a row that is being dragged relies on that.
 void KSAppEventFilter::cancelTouchWhenHidden(QObject* obj)
 {
-    if (m_touched.isEmpty() || !obj->isWidgetType()) {
+    if (m_touched.isEmpty() || !obj->isWidgetType())
         return;
-    }
     const auto* widget = static_cast<const QWidget*>(obj);
-    if (widget->isWindow()) {
+    if (widget->isWindow())
         cancelTouches(widget);
-    } else if (isTouched(obj) && !widget->isHidden()) {
+    else if (isTouched(obj) && !widget->isHidden())
         OneFinger::cancelTouchOf(obj);
-    }
 }
 
 int KSAppEventFilter::doLockTouchUpdate(QObject* obj, QEvent* event)
@@ -311,11 +290,9 @@ int KSAppEventFilter::doLockTouchUpdate(QObject* obj, QEvent* event)
     const LOCKMETHOD_TYPE method = getLockMethod(event);
     int result = 1;
     const QList<KSLockObject*> locks = m_active.keys();
-    for (KSLockObject* lock : locks) {
-        if (lock->isLockedObj(obj, method)) {
+    for (KSLockObject* lock : locks)
+        if (lock->isLockedObj(obj, method))
             result = 0;
-        }
-    }
     logTouch(QStringLiteral("Name = %1 :TouchUpdate %2; rs = %3 ;PointCount = %4")
                  .arg(objectName(), describe(obj))
                  .arg(result)
@@ -327,9 +304,8 @@ int KSAppEventFilter::doLockTouchEnd(QObject* obj, QEvent* event)
 {
     const LOCKMETHOD_TYPE method = getLockMethod(event);
     int result = 1;
-    if (isLock(obj, method)) {
+    if (isLock(obj, method))
         result = tryUnlock(obj, method);
-    }
     logTouch(QStringLiteral("Name = %1 :TouchEnd%2; rs = %3 :PointCount = %4")
                  .arg(objectName(), describe(obj))
                  .arg(result)
@@ -360,9 +336,8 @@ int KSAppEventFilter::tryUnlock(QObject* obj, LOCKMETHOD_TYPE method)
     int result = 1;
     const QList<KSLockObject*> locks = m_active.keys();
     for (KSLockObject* lock : locks) {
-        if (!lock->isRegisterObj(obj) || lock->tryUnlock(obj, method) != 0) {
+        if (!lock->isRegisterObj(obj) || lock->tryUnlock(obj, method) != 0)
             continue;
-        }
         removeActivateLockObject(obj, lock, method);
         logLock(L"KS tryUnLock", QStringLiteral("removed "), obj);
         if (wasLocked && !isLock(obj, method)) {
@@ -382,9 +357,8 @@ bool KSAppEventFilter::isLock(QObject*, LOCKMETHOD_TYPE)
 LOCKMETHOD_TYPE KSAppEventFilter::getLockMethod(QEvent* event)
 {
     const int type = event->type();
-    if (type == QEvent::TouchBegin || type == QEvent::TouchUpdate || type == QEvent::TouchEnd) {
+    if (type == QEvent::TouchBegin || type == QEvent::TouchUpdate || type == QEvent::TouchEnd)
         return LOCKMETHOD_TOUCH;
-    }
     return type > 1 && type < 6 ? LOCKMETHOD_MOUSE : LOCKMETHOD_OTHER;
 }
 
@@ -407,9 +381,8 @@ void KSAppEventFilter::breakLocks()
 {
     logTouch(QStringLiteral("Name = %1 :unlock").arg(objectName()));
     const QList<KSLockObject*> locks = m_active.keys();
-    for (KSLockObject* lock : locks) {
+    for (KSLockObject* lock : locks)
         lock->reset();
-    }
     clearActivateLockObject();
 }
 
@@ -422,18 +395,16 @@ void KSAppEventFilter::resetLock()
 
 void KSAppEventFilter::registerEventFilter(QObject* obj)
 {
-    if (obj == nullptr || m_eventFilters.contains(obj)) {
+    if (obj == nullptr || m_eventFilters.contains(obj))
         return;
-    }
     m_eventFilters.append(obj);
     connect(obj, &QObject::destroyed, this, [this](QObject* gone) { m_eventFilters.removeAll(gone); });
 }
 
 void KSAppEventFilter::unegisterEventFilter(QObject* obj)
 {
-    if (m_eventFilters.removeAll(obj) > 0) {
+    if (m_eventFilters.removeAll(obj) > 0)
         disconnect(obj, &QObject::destroyed, this, nullptr);
-    }
 }
 
 int KSAppEventFilter::priorityOf(LOCKOBJECT_TYPE type)
@@ -487,9 +458,8 @@ int KSAppEventFilter::initLockObject(QList<QObject*> objs, KSLockObject* lock, L
                                      void* param)
 {
     int result = 0;
-    for (QObject* obj : objs) {
+    for (QObject* obj : objs)
         result = initLockObject(obj, lock, type, param);
-    }
     return result;
 }
 
@@ -498,9 +468,8 @@ KSLockObject* KSAppEventFilter::createLockObject(QObject* obj, KSLockObject* loc
 {
     KSLockObject* result = preCreateLockObject(obj, lock, type, param);
     if (result != nullptr && initLockObject(obj, result, type, param) != 0) {
-        if (result != lock) {
+        if (result != lock)
             deleteLockObject(result);
-        }
         return nullptr;
     }
     return result;
@@ -511,9 +480,8 @@ KSLockObject* KSAppEventFilter::createLockObject(QList<QObject*> objs, KSLockObj
 {
     KSLockObject* result = preCreateLockObject(static_cast<QObject*>(nullptr), lock, type, param);
     if (result != nullptr && initLockObject(objs, result, type, param) != 0) {
-        if (result != lock) {
+        if (result != lock)
             deleteLockObject(result);
-        }
         return nullptr;
     }
     return result;
@@ -523,9 +491,8 @@ KSLockObject* KSAppEventFilter::registerLockObject(QObject* obj, KSLockObject* l
                                                    void* param)
 {
     KSLockObject* result = createLockObject(obj, lock, type, param);
-    if (result != nullptr) {
+    if (result != nullptr)
         addRegLockObject(obj, result, type, param);
-    }
     return result;
 }
 
@@ -533,26 +500,23 @@ KSLockObject* KSAppEventFilter::registerLockObject(QList<QObject*> objs, KSLockO
                                                    LOCKOBJECT_TYPE type, void* param)
 {
     KSLockObject* result = createLockObject(objs, lock, type, param);
-    if (result != nullptr) {
+    if (result != nullptr)
         addRegLockObject(static_cast<QObject*>(nullptr), result, type, param);
-    }
     return result;
 }
 
 int KSAppEventFilter::unregisterLockObject(QObject* obj, KSLockObject* lock)
 {
-    if (lock != nullptr) {
+    if (lock != nullptr)
         lock->unregisterObj(obj);
-    }
     return 0;
 }
 
 void KSAppEventFilter::addRegLockObject(QObject*, KSLockObject* lock, LOCKOBJECT_TYPE type, void*)
 {
     QList<KSLockObject*>& locks = m_registered[priorityOf(type)];
-    if (!locks.contains(lock)) {
+    if (!locks.contains(lock))
         locks.append(lock);
-    }
 }
 
 void KSAppEventFilter::addRegLockObject(QList<QObject*>, KSLockObject* lock, LOCKOBJECT_TYPE type,
@@ -563,9 +527,8 @@ void KSAppEventFilter::addRegLockObject(QList<QObject*>, KSLockObject* lock, LOC
 
 void KSAppEventFilter::removeRegLockObject(KSLockObject* lock)
 {
-    for (QList<KSLockObject*>& locks : m_registered) {
+    for (QList<KSLockObject*>& locks : m_registered)
         locks.removeAll(lock);
-    }
 }
 
 void KSAppEventFilter::notifyRegLockObjects(QObject* obj, KSLockObject* sender, LOCK_MESSAGE message,
@@ -573,11 +536,9 @@ void KSAppEventFilter::notifyRegLockObjects(QObject* obj, KSLockObject* sender, 
 {
     for (int priority = HIGHEST_PRIORITY; priority >= LOWEST_PRIORITY; --priority) {
         const QList<KSLockObject*> locks = m_registered.value(priority);
-        for (KSLockObject* lock : locks) {
-            if (flags != LOCK_NOTIFY_EXCEPT_SENDER || lock != sender) {
+        for (KSLockObject* lock : locks)
+            if (flags != LOCK_NOTIFY_EXCEPT_SENDER || lock != sender)
                 lock->notify(obj, sender, message, param);
-            }
-        }
     }
 }
 
@@ -589,21 +550,18 @@ void KSAppEventFilter::deleteLockObject(KSLockObject*)
 void KSAppEventFilter::addActivateLockObject(QObject* obj, KSLockObject* lock, LOCKMETHOD_TYPE)
 {
     QList<QObject*>& holders = m_active[lock];
-    if (obj != nullptr && !holders.contains(obj)) {
+    if (obj != nullptr && !holders.contains(obj))
         holders.append(obj);
-    }
 }
 
 void KSAppEventFilter::removeActivateLockObject(QObject* obj, KSLockObject* lock, LOCKMETHOD_TYPE)
 {
     const auto entry = m_active.find(lock);
-    if (entry == m_active.end()) {
+    if (entry == m_active.end())
         return;
-    }
     entry->removeAll(obj);
-    if (entry->isEmpty()) {
+    if (entry->isEmpty())
         m_active.erase(entry);
-    }
 }
 
 void KSAppEventFilter::clearActivateLockObject()
@@ -619,7 +577,6 @@ QMap<KSLockObject*, QList<QObject*>> KSAppEventFilter::activateLockObjects()
 
 void KSAppEventFilter::keepNewLockObject(KSLockObject* lock)
 {
-    if (lock != nullptr && !m_owned.contains(lock)) {
+    if (lock != nullptr && !m_owned.contains(lock))
         m_owned.append(lock);
-    }
 }

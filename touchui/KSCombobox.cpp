@@ -77,9 +77,8 @@ KSCombobox::KSCombobox(QWidget* parent)
     // Make the field of an editable box transparent, so that the pictures behind it are visible.
     QPalette colors = palette();
     colors.setColor(QPalette::Base, Qt::transparent);
-    for (const QPalette::ColorGroup group : {QPalette::Active, QPalette::Inactive}) {
+    for (const QPalette::ColorGroup group : {QPalette::Active, QPalette::Inactive})
         colors.setColor(group, QPalette::Text, TEXT_COLOR);
-    }
     colors.setColor(QPalette::Disabled, QPalette::Text, DISABLED_COLOR);
     setPalette(colors);
     setView(m_view);
@@ -94,9 +93,8 @@ KSCombobox::KSCombobox(QWidget* parent)
 KSCombobox::~KSCombobox()
 {
     m_popup->removeEventFilter(this);
-    if (m_shown && KSEventProcessLockObject::s_instance != nullptr) {
+    if (m_shown && KSEventProcessLockObject::s_instance != nullptr)
         KSEventProcessLockObject::s_instance->tryUnlock(this, LOCKMETHOD_OTHER);
-    }
 }
 
 // Configures the window in which the base class shows the list.
@@ -120,9 +118,8 @@ void KSCombobox::setBackgroundImagesPath(const QString& path)
 {
     const auto load = [&path](Slices& slices, const QString& state) {
         const char* const names[] = {"_Left", "_Center", "_Pulldown"};
-        for (std::size_t i = 0; i < slices.size(); ++i) {
+        for (std::size_t i = 0; i < slices.size(); ++i)
             slices[i] = QPixmap(path + state + QLatin1String(names[i]));
-        }
     };
     load(m_rest, QString());
     load(m_pressedSlices, QStringLiteral("_Pressed"));
@@ -139,14 +136,12 @@ void KSCombobox::setColorPallete(bool on)
 void KSCombobox::setUSBEnabled(bool enabled)
 {
     auto* items = qobject_cast<QStandardItemModel*>(model());
-    if (items == nullptr) {
+    if (items == nullptr)
         return;
-    }
     for (int row = 0; row < items->rowCount(); ++row) {
         QStandardItem* item = items->item(row);
-        if (item != nullptr && item->data(USB_ROLE).toBool()) {
+        if (item != nullptr && item->data(USB_ROLE).toBool())
             item->setEnabled(enabled);
-        }
     }
 }
 
@@ -162,18 +157,15 @@ void KSCombobox::setDisabled(bool disabled)
 
 void KSCombobox::showPopup()
 {
-    if (m_popup->isVisible()) {
+    if (m_popup->isVisible())
         return;
-    }
     Q_EMIT signalPopupShow();
-    if (count() == 0 || !m_popupEnable || !QWidget::isEnabled()) {
+    if (count() == 0 || !m_popupEnable || !QWidget::isEnabled())
         return;
-    }
     m_shown = true;
     // Announce the open list, so that it is closed when another process needs the touch.
-    if (KSEventProcessLockObject::s_instance != nullptr) {
+    if (KSEventProcessLockObject::s_instance != nullptr)
         KSEventProcessLockObject::s_instance->tryLock(this, LOCKMETHOD_OTHER, nullptr);
-    }
     Q_EMIT signalShowComboxList(true);
     m_view->setFont(font());
     adjustPopupListSize();
@@ -195,21 +187,18 @@ void KSCombobox::popupHidden()
 {
     m_outsidePress->stop();
     setPressed(false);
-    if (!m_shown) {
+    if (!m_shown)
         return;
-    }
     m_shown = false;
-    if (KSEventProcessLockObject::s_instance != nullptr) {
+    if (KSEventProcessLockObject::s_instance != nullptr)
         KSEventProcessLockObject::s_instance->tryUnlock(this, LOCKMETHOD_OTHER);
-    }
     Q_EMIT signalShowComboxList(false);
 }
 
 int KSCombobox::listWidth(int width, int textWidth, bool byText, bool withScrollBar)
 {
-    if (!byText || width >= textWidth + WITHOUT_BAR) {
+    if (!byText || width >= textWidth + WITHOUT_BAR)
         return width;
-    }
     return textWidth + (withScrollBar ? WITH_BAR : WITHOUT_BAR);
 }
 
@@ -222,9 +211,8 @@ void KSCombobox::setListWidth(int width, int textWidth)
 int KSCombobox::longestTextWidth() const
 {
     int longest = 0;
-    for (int row = 0; row < count(); ++row) {
+    for (int row = 0; row < count(); ++row)
         longest = qMax(longest, qCeil(QFontMetricsF(font()).horizontalAdvance(itemText(row))));
-    }
     return longest;
 }
 
@@ -264,17 +252,15 @@ void KSCombobox::choose(const QModelIndex& index)
 
 bool KSCombobox::eventFilter(QObject* obj, QEvent* event)
 {
-    if (obj == m_popup) {
+    if (obj == m_popup)
         return KeyEventFilter(obj, event) || handlePopupWidgetEvent(obj, event);
-    }
     return QComboBox::eventFilter(obj, event);
 }
 
 bool KSCombobox::KeyEventFilter(QObject*, QEvent* event)
 {
-    if (event->type() != QEvent::KeyPress) {
+    if (event->type() != QEvent::KeyPress)
         return false;
-    }
     const QModelIndex current = m_view->currentIndex();
     switch (static_cast<QKeyEvent*>(event)->key()) {
     case Qt::Key_Escape:
@@ -282,17 +268,15 @@ bool KSCombobox::KeyEventFilter(QObject*, QEvent* event)
         break;
     case Qt::Key_Return:
     case Qt::Key_Enter:
-        if (current.isValid() && (current.flags() & Qt::ItemIsEnabled)) {
+        if (current.isValid() && (current.flags() & Qt::ItemIsEnabled))
             choose(current);
-        }
         break;
     case Qt::Key_Up:
     case Qt::Key_Down: {
         const int step = static_cast<QKeyEvent*>(event)->key() == Qt::Key_Up ? -1 : 1;
         const QModelIndex next = current.siblingAtRow(current.row() + step);
-        if (next.isValid()) {
+        if (next.isValid())
             m_view->setCurrentIndex(next);
-        }
         break;
     }
     default:
@@ -403,9 +387,8 @@ void KSCombobox::changeEvent(QEvent* event)
 void KSCombobox::moveEvent(QMoveEvent* event)
 {
     QComboBox::moveEvent(event);
-    if (m_popup != nullptr && m_popup->isVisible()) {
+    if (m_popup != nullptr && m_popup->isVisible())
         adjustPopupListPostion();
-    }
 }
 
 void KSCombobox::paintEvent(QPaintEvent*)
@@ -414,20 +397,16 @@ void KSCombobox::paintEvent(QPaintEvent*)
     painter.setRenderHint(QPainter::SmoothPixmapTransform);
     const bool enabled = QWidget::isEnabled();
     const Slices* slices = &m_rest;
-    if (!enabled && !m_disabledSlices[1].isNull()) {
+    if (!enabled && !m_disabledSlices[1].isNull())
         slices = &m_disabledSlices;
-    } else if (m_pressed && !m_pressedSlices[1].isNull()) {
+    else if (m_pressed && !m_pressedSlices[1].isNull())
         slices = &m_pressedSlices;
-    }
     const NineSlice::Triple cells = NineSlice::row(rect(), (*slices)[0].width(), (*slices)[2].width());
-    for (std::size_t i = 0; i < cells.size(); ++i) {
-        if (!(*slices)[i].isNull() && !cells[i].isEmpty()) {
+    for (std::size_t i = 0; i < cells.size(); ++i)
+        if (!(*slices)[i].isNull() && !cells[i].isEmpty())
             painter.drawPixmap(cells[i], (*slices)[i]);
-        }
-    }
-    if (isEditable() || currentIndex() < 0) {
+    if (isEditable() || currentIndex() < 0)
         return;
-    }
     const QRect area = rect().adjusted(TEXT_MARGIN, 0, -qMax((*slices)[2].width(), TEXT_MARGIN), 0);
     const QModelIndex index = model()->index(currentIndex(), modelColumn(), rootModelIndex());
     if (m_delegate->colorPallete() && CustomComboBoxDelegate::rowColor(index).isValid()) {

@@ -7,13 +7,11 @@ KSEventClusterLockObject* KSEventClusterLockObject::createFactory(QObject* paren
 
 int KSEventClusterLockObject::tryLock(QObject* obj, LOCKMETHOD_TYPE, void*)
 {
-    if (m_holders.size() >= MAX_HOLDERS || !isRegisterObj(obj)) {
+    if (m_holders.size() >= MAX_HOLDERS || !isRegisterObj(obj))
         return -1;
-    }
     m_locked = true;
-    if (!m_holders.contains(obj)) {
+    if (!m_holders.contains(obj))
         m_holders.append(obj);
-    }
     return 0;
 }
 
@@ -34,9 +32,8 @@ bool KSEventClusterLockObject::isLockedObj(QObject* obj, LOCKMETHOD_TYPE)
 
 int KSEventClusterLockObject::registerObj(QObject* obj)
 {
-    if (!m_objects.contains(obj)) {
+    if (!m_objects.contains(obj))
         m_objects.append(obj);
-    }
     return 0;
 }
 

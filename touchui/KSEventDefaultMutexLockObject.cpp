@@ -25,9 +25,8 @@ KSEventDefaultMutexLockObject* KSEventDefaultMutexLockObject::s_instance = nullp
 KSEventDefaultMutexLockObject* KSEventDefaultMutexLockObject::createFactory(KSAppEventFilter* filter,
                                                                             QObject* parent)
 {
-    if (s_instance == nullptr) {
+    if (s_instance == nullptr)
         s_instance = new KSEventDefaultMutexLockObject(filter, parent);
-    }
     return s_instance;
 }
 
@@ -40,9 +39,8 @@ KSEventDefaultMutexLockObject::KSEventDefaultMutexLockObject(KSAppEventFilter* f
 
 KSEventDefaultMutexLockObject::~KSEventDefaultMutexLockObject()
 {
-    if (s_instance == this) {
+    if (s_instance == this)
         s_instance = nullptr;
-    }
 }
 
 int KSEventDefaultMutexLockObject::tryLock(QObject* obj, LOCKMETHOD_TYPE, void*)
@@ -54,9 +52,8 @@ int KSEventDefaultMutexLockObject::tryLock(QObject* obj, LOCKMETHOD_TYPE, void*)
         logTouch(QStringLiteral(" ; tryLock : LockedTimer is start."));
         return 0;
     }
-    if (m_lockObj == obj) {
+    if (m_lockObj == obj)
         return 0;
-    }
     logTouch(QStringLiteral("lock failed m_lockObj = ") + pointerText(m_lockObj));
     return -1;
 }
@@ -75,9 +72,8 @@ int KSEventDefaultMutexLockObject::tryUnlock(QObject* obj, LOCKMETHOD_TYPE)
 
 bool KSEventDefaultMutexLockObject::isLockedObj(QObject* obj, LOCKMETHOD_TYPE)
 {
-    if (m_lockObj == nullptr || m_lockObj != obj) {
+    if (m_lockObj == nullptr || m_lockObj != obj)
         return false;
-    }
     m_timer.start(WATCHDOG_MSEC);
     logTouch(QStringLiteral(" ; isLockedObj : LockedTimer is start."));
     return true;

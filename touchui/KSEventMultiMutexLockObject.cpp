@@ -9,9 +9,8 @@ KSEventMultiMutexLockObject* KSEventMultiMutexLockObject::createFactory(QObject*
 
 KSLockObject* KSEventMultiMutexLockObject::partOf(QObject* obj)
 {
-    if (obj == nullptr || obj->metaObject() != &QObject::staticMetaObject) {
+    if (obj == nullptr || obj->metaObject() != &QObject::staticMetaObject)
         return nullptr;
-    }
     return dynamic_cast<KSLockObject*>(obj);
 }
 
@@ -49,21 +48,18 @@ int KSEventMultiMutexLockObject::registerObj(QObject* obj)
 {
     KSLockObject* part = partOf(obj);
     // A group that contained itself would recurse without end.
-    if (part == nullptr || part == this) {
+    if (part == nullptr || part == this)
         return -1;
-    }
-    if (!m_parts.contains(part)) {
+    if (!m_parts.contains(part))
         m_parts.append(part);
-    }
     return 0;
 }
 
 int KSEventMultiMutexLockObject::unregisterObj(QObject* obj)
 {
     KSLockObject* part = partOf(obj);
-    if (part == nullptr) {
+    if (part == nullptr)
         return -1;
-    }
     m_parts.removeAll(part);
     return 0;
 }
@@ -80,9 +76,8 @@ int KSEventMultiMutexLockObject::notify(QObject*, KSLockObject*, LOCK_MESSAGE, v
 
 void KSEventMultiMutexLockObject::reset()
 {
-    for (KSLockObject* part : m_parts) {
+    for (KSLockObject* part : m_parts)
         part->reset();
-    }
 }
 
 QList<QObject*> KSEventMultiMutexLockObject::registeredObj()

@@ -7,9 +7,8 @@ KSEventMutexLockObject* KSEventMutexLockObject::createFactory(QObject* parent)
 
 int KSEventMutexLockObject::tryLock(QObject* obj, LOCKMETHOD_TYPE, void*)
 {
-    if (!isRegisterObj(obj)) {
+    if (!isRegisterObj(obj))
         return -1;
-    }
     if (!m_locked) {
         m_locked = true;
         m_holder = obj;
@@ -20,9 +19,8 @@ int KSEventMutexLockObject::tryLock(QObject* obj, LOCKMETHOD_TYPE, void*)
 
 int KSEventMutexLockObject::tryUnlock(QObject* obj, LOCKMETHOD_TYPE)
 {
-    if (!isRegisterObj(obj)) {
+    if (!isRegisterObj(obj))
         return -1;
-    }
     if (m_locked && m_holder == obj) {
         reset();
         return 0;
@@ -37,9 +35,8 @@ bool KSEventMutexLockObject::isLockedObj(QObject* obj, LOCKMETHOD_TYPE)
 
 int KSEventMutexLockObject::registerObj(QObject* obj)
 {
-    if (!m_objects.contains(obj)) {
+    if (!m_objects.contains(obj))
         m_objects.append(obj);
-    }
     return 0;
 }
 

@@ -15,25 +15,22 @@ KSEventProcessLockObject::KSEventProcessLockObject(KSAppEventFilter* filter, QOb
 
 KSEventProcessLockObject::~KSEventProcessLockObject()
 {
-    if (s_instance == this) {
+    if (s_instance == this)
         s_instance = nullptr;
-    }
 }
 
 int KSEventProcessLockObject::tryLock(QObject* obj, LOCKMETHOD_TYPE, void*)
 {
-    if (obj != nullptr) {
+    if (obj != nullptr)
         m_object = obj;
-    }
     send(APPEventDefine::LOCKTYPE_OBJECT, true);
     return -1;
 }
 
 int KSEventProcessLockObject::tryUnlock(QObject* obj, LOCKMETHOD_TYPE)
 {
-    if (m_object == obj) {
+    if (m_object == obj)
         m_object.clear();
-    }
     send(APPEventDefine::LOCKTYPE_OBJECT, false);
     return -1;
 }
@@ -45,9 +42,8 @@ bool KSEventProcessLockObject::isLockedObj(QObject*, LOCKMETHOD_TYPE)
 
 int KSEventProcessLockObject::registerObj(QObject* obj)
 {
-    if (!m_objects.contains(obj)) {
+    if (!m_objects.contains(obj))
         m_objects.append(obj);
-    }
     return 0;
 }
 
@@ -81,24 +77,21 @@ int KSEventProcessLockObject::notify(QObject*, KSLockObject*, LOCK_MESSAGE messa
 
 void KSEventProcessLockObject::slotGetAppEvent(APPEventDefine::_tagAPPEvent event)
 {
-    if (event.lockType == APPEventDefine::LOCKTYPE_OBJECT) {
+    if (event.lockType == APPEventDefine::LOCKTYPE_OBJECT)
         m_remoteObjectLocked = event.flag;
-    } else {
+    else
         m_remoteLocked = event.flag;
-    }
-    if (event.flag) {
+    if (event.flag)
         m_filter->lock(this);
-    } else if (!m_remoteObjectLocked && !m_remoteLocked) {
+    else if (!m_remoteObjectLocked && !m_remoteLocked)
         m_filter->unlock();
-    }
 }
 
 void KSEventProcessLockObject::slotRestoreOriginal()
 {
     ITitlerAPPEventFilterController* controller = ITitlerAPPEventFilterController::getInstance();
-    if (m_remoteObjectLocked && !m_remoteLocked && controller != nullptr) {
+    if (m_remoteObjectLocked && !m_remoteLocked && controller != nullptr)
         controller->informRestoreOriginal(APPEventDefine::EVENTREVICER_NONE);
-    }
 }
 
 void KSEventProcessLockObject::slotRestoreAll()
@@ -111,7 +104,6 @@ void KSEventProcessLockObject::slotRestoreAll()
 
 void KSEventProcessLockObject::send(APPEventDefine::LOCKTYPE type, bool on)
 {
-    if (ITitlerAPPEventFilterController* controller = ITitlerAPPEventFilterController::getInstance()) {
+    if (ITitlerAPPEventFilterController* controller = ITitlerAPPEventFilterController::getInstance())
         controller->sendAPPEvent(type, on);
-    }
 }

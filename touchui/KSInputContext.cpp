@@ -48,9 +48,8 @@ bool serviceOwnsState()
 void KSInputContext::install()
 {
     const QByteArray chosen = qgetenv("QT_IM_MODULE");
-    if (chosen == KSInputContextPlugin::KEY) {
+    if (chosen == KSInputContextPlugin::KEY)
         return;
-    }
     KSInputContextPlugin::setInnerMethod(QString::fromLocal8Bit(chosen));
     qputenv("QT_IM_MODULE", KSInputContextPlugin::KEY);
 }
@@ -58,9 +57,8 @@ void KSInputContext::install()
 KSInputContext::KSInputContext(std::unique_ptr<QPlatformInputContext> inner)
     : m_inner(inner != nullptr ? std::move(inner) : std::make_unique<QPlatformInputContext>())
 {
-    if (s_instance == nullptr) {
+    if (s_instance == nullptr)
         s_instance = this;
-    }
     // The X11 platform finds the composing input method by this name and passes it the keyboard's context.
     setObjectName(m_inner->objectName());
     INIT_LOGGING(L"KS2Titler");
@@ -99,9 +97,8 @@ bool KSInputContext::filterEvent(const QEvent* event)
 {
     switch (event->type()) {
     case QEvent::KeyPress:
-        if (filterKeyPressEvent(event)) {
+        if (filterKeyPressEvent(event))
             return true;
-        }
         break;
     case QEvent::RequestSoftwareInputPanel:
         return filterRequestSoftwareInputPanel();
@@ -116,9 +113,8 @@ bool KSInputContext::filterEvent(const QEvent* event)
 bool KSInputContext::forwardKeyPress(const QEvent* event)
 {
     const auto key = ServiceKey::ofPress(event);
-    if (m_controller == nullptr || !key) {
+    if (m_controller == nullptr || !key)
         return false;
-    }
     if (!m_controller->isReachable()) {
         setClosed(true); // the service would not send the key back, so the field handles it
         return false;
@@ -144,25 +140,21 @@ bool KSInputContext::filterRequestSoftwareInputPanel()
 
 bool KSInputContext::showForFocusWidget(const tagSoftKeyBoardInitData& data)
 {
-    if (m_controller == nullptr || !m_controller->isReachable()) {
+    if (m_controller == nullptr || !m_controller->isReachable())
         return false;
-    }
-    if (m_bClosed) {
+    if (m_bClosed)
         m_controller->registerCallBack(this);
-    }
     showAtService(data);
     return true;
 }
 
 bool KSInputContext::filterCloseSoftwareInputPanel()
 {
-    if (m_controller == nullptr) {
+    if (m_controller == nullptr)
         return false;
-    }
     const auto field = InputField::of(getFocusWidget());
-    if (field == nullptr || !field->keepsKeyboard()) {
+    if (field == nullptr || !field->keepsKeyboard())
         closeSoftKeyBoardWindow();
-    }
     return true;
 }
 
@@ -170,9 +162,8 @@ bool KSInputContext::filterCloseSoftwareInputPanel()
 
 void KSInputContext::setFocusWidget(QWidget* widget)
 {
-    if (!m_bClosed && !serviceOwnsState()) {
+    if (!m_bClosed && !serviceOwnsState())
         return;
-    }
     KSInputFocusManager::giveFocus(widget);
     m_keyReleases.watch(widget);
     m_baseFocusWidget = widget;
@@ -180,9 +171,8 @@ void KSInputContext::setFocusWidget(QWidget* widget)
 
 QWidget* KSInputContext::getFocusWidget()
 {
-    if (m_bClosed || m_pFocusWidget == nullptr) {
+    if (m_bClosed || m_pFocusWidget == nullptr)
         m_pFocusWidget = m_baseFocusWidget;
-    }
     return m_pFocusWidget;
 }
 
@@ -193,9 +183,8 @@ QGraphicsTextItem* KSInputContext::getFocusTextItem(QGraphicsView* view)
 
 bool KSInputContext::isErrorForGettingFocusWidget()
 {
-    if (getFocusWidget() != nullptr) {
+    if (getFocusWidget() != nullptr)
         return false;
-    }
     LOG_DEBUG_OPERATE(L"KSInputContext", 200, L"no field has the focus");
     return true;
 }
@@ -221,9 +210,8 @@ tagSoftKeyBoardInitData KSInputContext::sendDataOf(const InputField* field)
 
 void KSInputContext::showSoftKeyBoardWindow(tagSoftKeyBoardInitData data)
 {
-    if (m_controller == nullptr) {
+    if (m_controller == nullptr)
         return;
-    }
     m_strLimitCondition = QString::fromStdWString(data.limitCondition);
     m_controller->registerCallBack(this);
     showAtService(data);
@@ -238,14 +226,12 @@ void KSInputContext::showAtService(const tagSoftKeyBoardInitData& data)
 
 void KSInputContext::closeSoftKeyBoardWindow()
 {
-    if (m_controller == nullptr) {
+    if (m_controller == nullptr)
         return;
-    }
     m_controller->close();
     resetFocusWidget();
-    if (!serviceOwnsState()) {
+    if (!serviceOwnsState())
         setClosed(true);
-    }
 }
 
 void KSInputContext::dummyCloseSoftKeyBoardWindow()
@@ -260,39 +246,34 @@ void KSInputContext::simpleCloseSoftKeyBoardWindow()
 
 void KSInputContext::closeAtOnce(void (ISoftKeyBoardController::*close)())
 {
-    if (m_controller != nullptr) {
+    if (m_controller != nullptr)
         (m_controller->*close)();
-    }
     setClosed(true);
     resetFocusWidget();
 }
 
 void KSInputContext::showLimitInfo(taLimitInfo info)
 {
-    if (isOpenAtService()) {
+    if (isOpenAtService())
         m_controller->sendLimitInfo(info);
-    }
 }
 
 void KSInputContext::cancelLimitInfo()
 {
-    if (isOpenAtService()) {
+    if (isOpenAtService())
         m_controller->closeLimitBalloon();
-    }
 }
 
 void KSInputContext::showMaskOnSoftKeyboard()
 {
-    if (isOpenAtService()) {
+    if (isOpenAtService())
         m_controller->showMask();
-    }
 }
 
 void KSInputContext::hideMaskOnSoftKeyboard()
 {
-    if (isOpenAtService()) {
+    if (isOpenAtService())
         m_controller->hideMask();
-    }
 }
 
 void KSInputContext::setWindowID(unsigned long id)
@@ -307,29 +288,25 @@ void KSInputContext::setWindowID(unsigned long id)
 void KSInputContext::handleInputString(const std::wstring& text, bool onEnter)
 {
     const auto field = isErrorForGettingFocusWidget() ? nullptr : InputField::of(getFocusWidget());
-    if (field == nullptr) {
+    if (field == nullptr)
         return;
-    }
-    if (onEnter || field->keepsKeyboard()) {
+    if (onEnter || field->keepsKeyboard())
         field->enter(QString::fromStdWString(text));
-    } else {
+    else
         checkInputString(*field, text);
-    }
 }
 
 void KSInputContext::sendInputStringOnTextChanged(std::wstring text)
 {
     const auto field = isErrorForGettingFocusWidget() ? nullptr : InputField::of(getFocusWidget());
-    if (field != nullptr) {
+    if (field != nullptr)
         checkInputString(*field, text);
-    }
 }
 
 void KSInputContext::checkInputString(InputField& field, const std::wstring& text)
 {
-    if (!field.judge(QString::fromStdWString(text))) {
+    if (!field.judge(QString::fromStdWString(text)))
         showLimitInfo(taLimitInfo());
-    }
 }
 
 void KSInputContext::sendKey(tagSoftKeyBoardKeyData data)
@@ -342,9 +319,8 @@ void KSInputContext::sendKey(tagSoftKeyBoardKeyData data)
         sendSoftKeyBoardClosedEventToFocusWidget();
         return;
     }
-    if (!ServiceKey::isKey(data)) {
+    if (!ServiceKey::isKey(data))
         return;
-    }
     const QPointer<QWidget> widget = getFocusWidget();
     const auto entered = InputField::of(widget);
     const bool endsField = entered == nullptr || !entered->keepsKeyboard();
@@ -354,13 +330,11 @@ void KSInputContext::sendKey(tagSoftKeyBoardKeyData data)
     }
     const auto field = InputField::of(widget); // closing may have destroyed the field
     QObject* target = field == nullptr ? widget.data() : field->keyReceiver();
-    if (target == nullptr) {
+    if (target == nullptr)
         return;
-    }
     QKeyEvent key = ServiceKey::toEvent(data);
-    if (key.type() == QEvent::KeyPress) {
+    if (key.type() == QEvent::KeyPress)
         TypedTextLog::write(key.text());
-    }
     const QScopedValueRollback<bool> sending(m_sendingKeyEvent, true);
     QCoreApplication::sendEvent(target, &key);
 }
@@ -378,12 +352,10 @@ void KSInputContext::sendSoftKeyBoardClosedEventToFocusWidget()
 
 void KSInputContext::sendInputStringSelectionPos(tagSoftKeyBoardKeyTextSelectionPos pos)
 {
-    if (m_bClosed) {
+    if (m_bClosed)
         return;
-    }
-    if (const auto field = InputField::of(getFocusWidget())) {
+    if (const auto field = InputField::of(getFocusWidget()))
         field->select(pos);
-    }
 }
 
 void KSInputContext::sendEvent(const QInputMethodEvent& event)
@@ -407,9 +379,8 @@ void KSInputContext::setXkbContext(struct xkb_context* context)
 // that the operator has closed.
 void KSInputContext::showInputPanel()
 {
-    if (m_sendingKeyEvent || m_keyReleases.isReleasing()) {
+    if (m_sendingKeyEvent || m_keyReleases.isReleasing())
         return;
-    }
     const QEvent request(QEvent::RequestSoftwareInputPanel);
     filterEvent(&request);
 }
@@ -420,9 +391,8 @@ void KSInputContext::showInputPanel()
 void KSInputContext::hideInputPanel()
 {
     const bool stillInField = m_pFocusWidget != nullptr && m_pFocusWidget->hasFocus();
-    if (m_bClosed || stillInField || QGuiApplication::focusWindow() == nullptr) {
+    if (m_bClosed || stillInField || QGuiApplication::focusWindow() == nullptr)
         return;
-    }
     const QEvent request(QEvent::CloseSoftwareInputPanel);
     filterEvent(&request);
 }

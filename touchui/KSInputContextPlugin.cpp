@@ -25,18 +25,15 @@ void KSInputContextPlugin::setInnerMethod(const QString& key)
 
 QPlatformInputContext* KSInputContextPlugin::create(const QString& key, const QStringList&)
 {
-    if (key.compare(QLatin1String(KEY), Qt::CaseInsensitive) != 0) {
+    if (key.compare(QLatin1String(KEY), Qt::CaseInsensitive) != 0)
         return nullptr;
-    }
     // On X11 an input method is needed even without a daemon: it handles dead keys and the compose key.
     QString inner = innerMethod();
-    if (inner.isEmpty() && QGuiApplication::platformName() == QLatin1String("xcb")) {
+    if (inner.isEmpty() && QGuiApplication::platformName() == QLatin1String("xcb"))
         inner = QStringLiteral("compose");
-    }
     std::unique_ptr<QPlatformInputContext> context;
-    if (!inner.isEmpty()) {
+    if (!inner.isEmpty())
         context.reset(QPlatformInputContextFactory::create(inner));
-    }
     return new KSInputContext(std::move(context));
 }
 

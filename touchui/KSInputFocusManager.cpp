@@ -20,9 +20,8 @@ class DisplayConnection
 public:
     DisplayConnection() : m_display(XOpenDisplay(nullptr))
     {
-        if (m_display != nullptr) {
+        if (m_display != nullptr)
             m_previousHandler = XSetErrorHandler(ignoreError);
-        }
     }
     ~DisplayConnection()
     {
@@ -60,9 +59,8 @@ unsigned long KSInputFocusManager::getInputFocusWindow()
 void KSInputFocusManager::setInputFocusWindow(unsigned long window)
 {
     const DisplayConnection connection;
-    if (connection.get() == nullptr || window == None) {
+    if (connection.get() == nullptr || window == None)
         return;
-    }
     if (focusWindow(connection.get()) != window) {
         XSetInputFocus(connection.get(), window, RevertToPointerRoot, CurrentTime);
         XFlush(connection.get());
@@ -71,20 +69,17 @@ void KSInputFocusManager::setInputFocusWindow(unsigned long window)
 
 void KSInputFocusManager::giveFocus(unsigned long window)
 {
-    if (QGuiApplication::platformName() == QLatin1String("xcb")) {
+    if (QGuiApplication::platformName() == QLatin1String("xcb"))
         setInputFocusWindow(window);
-    }
 }
 
 // Does nothing while a modal dialog is open: a window may be activated after a dialog has opened before it,
 // and both would take the focus from each other without end.
 void KSInputFocusManager::giveFocus(const QWidget* widget)
 {
-    if (widget == nullptr || !widget->window()->isVisible() || widget->window()->internalWinId() == 0) {
+    if (widget == nullptr || !widget->window()->isVisible() || widget->window()->internalWinId() == 0)
         return;
-    }
     const QWidget* dialog = QApplication::activeModalWidget();
-    if (dialog == nullptr || dialog == widget->window()) {
+    if (dialog == nullptr || dialog == widget->window())
         giveFocus(static_cast<unsigned long>(widget->window()->internalWinId()));
-    }
 }

@@ -44,9 +44,8 @@ KSMenu::KSMenu(QWidget* parent, const QFont& font)
     setAttribute(Qt::WA_AcceptTouchEvents);
     setAttribute(Qt::WA_ShowWithoutActivating);
     QFont textFont = font;
-    if (font == QFont()) {
+    if (font == QFont())
         textFont.setPixelSize(TEXT_PIXELS);
-    }
     setFont(textFont);
     connect(m_outsidePress, &OutsidePressFilter::pressedOutside, this, &QWidget::close);
     const auto place = [this] { return m_finger.positionIn(this).toPoint(); };
@@ -75,11 +74,9 @@ bool KSMenu::testBalloonAlignment(int flag) const
 int KSMenu::flags() const
 {
     int result = 0;
-    for (const int flag : {MenuPlacement::Below, MenuPlacement::Above, MenuPlacement::Horizontal}) {
-        if (testBalloonAlignment(flag)) {
+    for (const int flag : {MenuPlacement::Below, MenuPlacement::Above, MenuPlacement::Horizontal})
+        if (testBalloonAlignment(flag))
             result |= flag;
-        }
-    }
     return result;
 }
 
@@ -92,9 +89,8 @@ void KSMenu::popup(const QPoint& anchor, QAction* atAction)
 
 void KSMenu::showEvent(QShowEvent* event)
 {
-    if (!m_hasAnchor) {
+    if (!m_hasAnchor)
         m_anchor = pos();
-    }
     m_hasAnchor = false;
     setCurrent(-1);
     resize(sizeHint());
@@ -110,9 +106,8 @@ void KSMenu::hideEvent(QHideEvent* event)
 {
     m_outsidePress->stop();
     setCurrent(-1);
-    if (m_autoCloseTimer != nullptr) {
+    if (m_autoCloseTimer != nullptr)
         m_autoCloseTimer->stop();
-    }
     QMenu::hideEvent(event);
 }
 
@@ -178,11 +173,9 @@ int KSMenu::cursorItem(const QPoint& point) const
 QList<QAction*> KSMenu::rows() const
 {
     QList<QAction*> result;
-    for (QAction* action : actions()) {
-        if (action->isVisible() && !action->isSeparator()) {
+    for (QAction* action : actions())
+        if (action->isVisible() && !action->isSeparator())
             result.append(action);
-        }
-    }
     return result;
 }
 
@@ -191,9 +184,8 @@ QSize KSMenu::sizeHint() const
     const QFontMetrics metrics(font());
     int width = 0;
     const QList<QAction*> list = rows();
-    for (const QAction* action : list) {
+    for (const QAction* action : list)
         width = qMax(width, metrics.horizontalAdvance(action->text()));
-    }
     const int rowHeight = qMax(ROW_HEIGHT, metrics.height() + 2 * ROW_PADDING);
     const QSize body(qMax(LEAST_WIDTH, width + 2 * TEXT_MARGIN + 2 * BORDER),
                      rowHeight * qMax(1, static_cast<int>(list.size())) + 2 * BORDER);
@@ -205,16 +197,14 @@ QSize KSMenu::sizeHint() const
 void KSMenu::setAutoCloseTime(int milliseconds)
 {
     m_autoCloseTime = qMax(0, milliseconds);
-    if (m_autoCloseTime == 0 && m_autoCloseTimer != nullptr) {
+    if (m_autoCloseTime == 0 && m_autoCloseTimer != nullptr)
         m_autoCloseTimer->stop();
-    }
 }
 
 void KSMenu::startAutoCloseTimer()
 {
-    if (m_autoCloseTime <= 0) {
+    if (m_autoCloseTime <= 0)
         return;
-    }
     delete m_autoCloseTimer;
     m_autoCloseTimer = new QTimer(this);
     m_autoCloseTimer->setSingleShot(true);
@@ -224,9 +214,8 @@ void KSMenu::startAutoCloseTimer()
 
 void KSMenu::restartAutoCloseTimer()
 {
-    if (isVisible()) {
+    if (isVisible())
         startAutoCloseTimer();
-    }
 }
 
 bool KSMenu::event(QEvent* event)
@@ -240,9 +229,8 @@ bool KSMenu::event(QEvent* event)
         onMouseLeave();
         return true;
     case QEvent::Close:
-        if (isVisible()) {
+        if (isVisible())
             Q_EMIT signalMenuAboutToClose();
-        }
         return QMenu::event(event);
     case QEvent::MouseButtonPress:
     case QEvent::MouseButtonDblClick:
@@ -259,16 +247,14 @@ bool KSMenu::onMouseEvent(QEvent* event)
 {
     const auto* mouse = static_cast<QMouseEvent*>(event);
     const QPoint position = mouse->position().toPoint();
-    if (m_finger.isDown()) {
+    if (m_finger.isDown())
         return true; // a finger is using the menu
-    }
-    if (event->type() == QEvent::MouseMove) {
+    if (event->type() == QEvent::MouseMove)
         onMouseMove(position);
-    } else if (event->type() == QEvent::MouseButtonRelease) {
+    else if (event->type() == QEvent::MouseButtonRelease)
         onMouseButtonRelease(position, mouse->button());
-    } else {
+    else
         onMouseButtonPress(position);
-    }
     return true;
 }
 
@@ -293,9 +279,8 @@ bool KSMenu::onKeyEvent(QKeyEvent* event)
         break;
     case Qt::Key_Return:
     case Qt::Key_Enter:
-        if (m_current >= 0) {
+        if (m_current >= 0)
             onMouseButtonRelease(getMenuItemRect(m_current).center(), Qt::LeftButton);
-        }
         break;
     default:
         return false;
@@ -306,9 +291,8 @@ bool KSMenu::onKeyEvent(QKeyEvent* event)
 
 void KSMenu::onMouseLeave()
 {
-    if (!m_finger.isDown()) {
+    if (!m_finger.isDown())
         setCurrent(-1);
-    }
 }
 
 void KSMenu::onMouseButtonPress(const QPoint& position)
@@ -325,9 +309,8 @@ void KSMenu::onMouseMove(const QPoint& position)
 void KSMenu::onMouseButtonRelease(const QPoint& position, Qt::MouseButton button)
 {
     setCurrent(cursorItem(position));
-    if (m_current < 0 || (button != Qt::LeftButton && button != Qt::NoButton)) {
+    if (m_current < 0 || (button != Qt::LeftButton && button != Qt::NoButton))
         return;
-    }
     const QPointer<QAction> action = rows().value(m_current);
     setCurrent(-1);
     if (action == nullptr || !action->isEnabled()) {
@@ -335,9 +318,8 @@ void KSMenu::onMouseButtonRelease(const QPoint& position, Qt::MouseButton button
         return;
     }
     close();
-    if (action != nullptr) {
+    if (action != nullptr)
         action->trigger(); // also emits triggered(QAction*)
-    }
 }
 
 void KSMenu::setCurrent(int row)
@@ -357,9 +339,8 @@ void KSMenu::adjustMask()
     drawBalloon(painter);
     painter.end();
     QRegion region(shape.mask());
-    if (region.isEmpty()) {
+    if (region.isEmpty())
         region = QRegion(getMenuBackgroundRect()) + QRegion(getMenuPointPoints());
-    }
     setMask(region);
 }
 
@@ -367,9 +348,8 @@ void KSMenu::drawBalloon(QPainter& painter) const
 {
     const MenuPlacement::Placement place = placement();
     m_frame.paint(painter, MenuPlacement::background(size(), place.side));
-    if (m_arrow.isNull()) {
+    if (m_arrow.isNull())
         return;
-    }
     // The arrow's picture points up. Its lower part overlaps the frame.
     painter.save();
     switch (place.side) {
@@ -399,17 +379,15 @@ void KSMenu::paintEvent(QPaintEvent*)
     painter.setRenderHint(QPainter::SmoothPixmapTransform);
     drawBalloon(painter);
     const QList<QAction*> list = rows();
-    for (int row = 0; row < list.size(); ++row) {
+    for (int row = 0; row < list.size(); ++row)
         drawMenuItem(painter, row, list.at(row));
-    }
 }
 
 void KSMenu::drawMenuItem(QPainter& painter, int row, const QAction* action)
 {
     const QRect rect = getMenuItemRect(row);
-    if (row == m_current && action->isEnabled()) {
+    if (row == m_current && action->isEnabled())
         painter.drawPixmap(rect, m_cursor);
-    }
     if (row > 0 && !m_separator.isNull()) {
         painter.drawPixmap(
             QRect(rect.x(), rect.y() - m_separator.height() / 2, rect.width(), m_separator.height()),

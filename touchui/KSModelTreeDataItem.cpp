@@ -5,9 +5,8 @@
 void KSModelTreeDataItem::setRoot(KSModelItem* root)
 {
     m_root = root;
-    for (const auto& child : m_children) {
+    for (const auto& child : m_children)
         child->setRoot(root);
-    }
 }
 
 KSModelItem* KSModelTreeDataItem::child(int row) const
@@ -20,9 +19,8 @@ QList<KSModelItem*> KSModelTreeDataItem::children(bool deep) const
     QList<KSModelItem*> list;
     for (const auto& child : m_children) {
         list.append(child.get());
-        if (deep) {
+        if (deep)
             list.append(child->children(true));
-        }
     }
     return list;
 }
@@ -46,9 +44,8 @@ KSModelItem* KSModelTreeDataItem::insertPrev(std::unique_ptr<KSModelItem> item)
 
 KSModelItem* KSModelTreeDataItem::addChild(std::unique_ptr<KSModelItem> item, int row)
 {
-    if (item == nullptr) {
+    if (item == nullptr)
         return nullptr;
-    }
     KSModelItem* added = item.get();
     added->setParent(this);
     added->setRoot(m_root);
@@ -59,9 +56,8 @@ KSModelItem* KSModelTreeDataItem::addChild(std::unique_ptr<KSModelItem> item, in
 
 std::unique_ptr<KSModelItem> KSModelTreeDataItem::remove(int row)
 {
-    if (row < 0 || row >= childCount()) {
+    if (row < 0 || row >= childCount())
         return nullptr;
-    }
     const auto at = m_children.begin() + row;
     std::unique_ptr<KSModelItem> taken = std::move(*at);
     m_children.erase(at);
@@ -90,26 +86,22 @@ int KSModelTreeDataItem::indexOfChildList(const KSModelItem* item) const
 
 bool KSModelTreeDataItem::orderChildList(const QList<KSModelItem*>& order)
 {
-    if (order.size() != childCount()) {
+    if (order.size() != childCount())
         return false;
-    }
     QHash<KSModelItem*, size_t> rows;
-    for (size_t row = 0; row < m_children.size(); ++row) {
+    for (size_t row = 0; row < m_children.size(); ++row)
         rows.insert(m_children[row].get(), row);
-    }
     std::vector<size_t> places;
     for (KSModelItem* item : order) {
         const auto found = rows.constFind(item);
-        if (found == rows.constEnd()) {
+        if (found == rows.constEnd())
             return false;
-        }
         places.push_back(*found);
         rows.erase(found);
     }
     std::vector<std::unique_ptr<KSModelItem>> ordered;
-    for (const size_t place : places) {
+    for (const size_t place : places)
         ordered.push_back(std::move(m_children[place]));
-    }
     m_children = std::move(ordered);
     return true;
 }
@@ -117,29 +109,24 @@ bool KSModelTreeDataItem::orderChildList(const QList<KSModelItem*>& order)
 QVariant KSModelTreeDataItem::getAttribute(int role, int column) const
 {
     const auto found = m_attributes.constFind(role);
-    if (found == m_attributes.constEnd() || column < 0) {
+    if (found == m_attributes.constEnd() || column < 0)
         return QVariant();
-    }
-    if (found->size() == 1) {
+    if (found->size() == 1)
         return found->constFirst();
-    }
     return column < found->size() ? found->at(column) : QVariant();
 }
 
 void KSModelTreeDataItem::setAttribute(int role, const QVariant& value, int column)
 {
-    if (column < 0) {
+    if (column < 0)
         return;
-    }
     QList<QVariant>& values = m_attributes[role];
-    if (values.isEmpty()) {
+    if (values.isEmpty())
         values.resize(1);
-    }
-    if (values.size() == 1) {
+    if (values.size() == 1)
         values[0] = value;
-    } else if (column < values.size()) {
+    else if (column < values.size())
         values[column] = value;
-    }
 }
 
 void KSModelTreeDataItem::setAttributeMaxKey(int role, int maxColumn)
@@ -155,11 +142,9 @@ int KSModelTreeDataItem::getAttributeMaxKey(int role) const
 
 void KSModelTreeDataItem::insertAttributeColumns(int column, int count)
 {
-    for (QList<QVariant>& values : m_attributes) {
-        if (values.size() > 1 && column >= 0 && column <= values.size()) {
+    for (QList<QVariant>& values : m_attributes)
+        if (values.size() > 1 && column >= 0 && column <= values.size())
             values.insert(column, count, QVariant());
-        }
-    }
 }
 
 void KSModelTreeDataItem::removeAttributeColumns(int column, int count)
@@ -167,9 +152,8 @@ void KSModelTreeDataItem::removeAttributeColumns(int column, int count)
     for (QList<QVariant>& values : m_attributes) {
         if (values.size() > 1 && column >= 0 && column < values.size()) {
             values.remove(column, std::min<qsizetype>(count, values.size() - column));
-            if (values.isEmpty()) {
+            if (values.isEmpty())
                 values.resize(1);
-            }
         }
     }
 }

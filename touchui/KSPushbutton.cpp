@@ -47,29 +47,25 @@ void KSPushbutton::changeButtonState(_enumButtonState state)
 
 void KSPushbutton::changeButtonState(int state)
 {
-    if (state < ButtonRest || state >= ButtonStateCount) {
+    if (state < ButtonRest || state >= ButtonStateCount)
         return;
-    }
     m_state = static_cast<_enumButtonState>(state);
-    if (m_autoState) {
+    if (m_autoState)
         m_paintedState = m_state;
-    }
     update();
 }
 
 void KSPushbutton::setAutoState(bool autoState)
 {
     m_autoState = autoState;
-    if (m_autoState) {
+    if (m_autoState)
         changeButtonState(m_state);
-    }
 }
 
 void KSPushbutton::setSelected(bool selected)
 {
-    if (selected != isSelected()) {
+    if (selected != isSelected())
         changeButtonState(selected ? m_state + ButtonSelectedRest : m_state - ButtonSelectedRest);
-    }
 }
 
 void KSPushbutton::setImage(const QString& images)
@@ -112,11 +108,10 @@ void KSPushbutton::changeEvent(QEvent* event)
 {
     if (event->type() == QEvent::EnabledChange) {
         const int row = isSelected() ? ButtonSelectedRest : ButtonRest;
-        if (!isEnabled()) {
+        if (!isEnabled())
             changeButtonState(row + ButtonDisabled);
-        } else if (m_state == row + ButtonDisabled) {
+        else if (m_state == row + ButtonDisabled)
             changeButtonState(row + ButtonRest);
-        }
     }
     TouchEventButton::changeEvent(event);
 }
@@ -126,26 +121,22 @@ void KSPushbutton::paintEvent(QPaintEvent*)
     QPainter painter(this);
     painter.setRenderHint(QPainter::SmoothPixmapTransform);
     drawImage(painter, m_paintedState);
-    if (!m_backgroundImage.isNull()) {
+    if (!m_backgroundImage.isNull())
         painter.drawPixmap(rect(), m_backgroundImage);
-    }
     drawIcon(painter);
-    if (!m_movableImage.isNull()) {
+    if (!m_movableImage.isNull())
         painter.drawPixmap(m_movablePosition, m_movableImage);
-    }
     drawText(painter);
 }
 
 const QPixmap& KSPushbutton::slice(int index)
 {
     static const QPixmap none;
-    if (index >= m_imageNames.size() || m_imageNames.at(index).isEmpty()) {
+    if (index >= m_imageNames.size() || m_imageNames.at(index).isEmpty())
         return none;
-    }
     QPixmap& pixmap = m_slices[index];
-    if (pixmap.isNull()) {
+    if (pixmap.isNull())
         pixmap.load(QStringLiteral(":/%1/%2").arg(m_imageNames.constFirst(), m_imageNames.at(index)));
-    }
     return pixmap;
 }
 
@@ -157,23 +148,19 @@ void KSPushbutton::drawImage(QPainter& painter, _enumButtonState state)
     const QPixmap& right = slice(first + 2);
     const int leftWidth = left.isNull() ? 0 : left.width();
     const int rightWidth = right.isNull() ? 0 : right.width();
-    if (!left.isNull()) {
+    if (!left.isNull())
         painter.drawPixmap(QRect(0, 0, leftWidth, height()), left);
-    }
-    if (!right.isNull()) {
+    if (!right.isNull())
         painter.drawPixmap(QRect(width() - rightWidth, 0, rightWidth, height()), right);
-    }
     const int middle = width() - leftWidth - rightWidth;
-    if (!center.isNull() && middle > 0) {
+    if (!center.isNull() && middle > 0)
         painter.drawPixmap(QRect(leftWidth, 0, middle, height()), center);
-    }
 }
 
 void KSPushbutton::drawIcon(QPainter& painter)
 {
-    if (icon().isNull()) {
+    if (icon().isNull())
         return;
-    }
     const QRect area(QPoint((width() - iconSize().width()) / 2, (height() - iconSize().height()) / 2),
                      iconSize());
     // The owner sets a separate picture for the disabled state; Qt must not compute one.
@@ -182,9 +169,8 @@ void KSPushbutton::drawIcon(QPainter& painter)
 
 void KSPushbutton::drawText(QPainter& painter)
 {
-    if (text().isEmpty()) {
+    if (text().isEmpty())
         return;
-    }
     const bool disabled = m_paintedState == ButtonDisabled || m_paintedState == ButtonSelectedDisabled;
     // Bright text on the dark pictures, unless the owner has set another colour.
     const bool chosen = palette().isBrushSet(QPalette::Active, QPalette::ButtonText);

@@ -61,9 +61,8 @@ QSize KSRadiobutton::pictureSize() const
 QSize KSRadiobutton::sizeHint() const
 {
     const QSize picture = pictureSize();
-    if (text().isEmpty()) {
+    if (text().isEmpty())
         return picture;
-    }
     return QSize(picture.width() + GAP + fontMetrics().horizontalAdvance(text()),
                  qMax(picture.height(), fontMetrics().height()));
 }
@@ -82,13 +81,12 @@ void KSRadiobutton::sendMouse(QEvent::Type type, const QPointF& position)
 {
     const QPoint place = position.toPoint();
     QMouseEvent event = OneFinger::mouseEvent(type, place, mapToGlobal(place));
-    if (type == QEvent::MouseButtonPress) {
+    if (type == QEvent::MouseButtonPress)
         mousePressEvent(&event);
-    } else if (type == QEvent::MouseMove) {
+    else if (type == QEvent::MouseMove)
         mouseMoveEvent(&event);
-    } else {
+    else
         mouseReleaseEvent(&event);
-    }
 }
 
 // Releases the button without choosing it.
@@ -113,9 +111,8 @@ void KSRadiobutton::paintEvent(QPaintEvent*)
     } else {
         painter.drawPixmap(place, picture);
     }
-    if (text().isEmpty()) {
+    if (text().isEmpty())
         return;
-    }
     painter.setFont(font());
     painter.setPen(isEnabled() ? TEXT_COLOR : DISABLED_COLOR);
     painter.drawText(rect().adjusted(size.width() + GAP, 0, 0, 0),

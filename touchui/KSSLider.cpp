@@ -88,11 +88,10 @@ void KSSLider::setReponse(bool response)
 
 void KSSLider::ShowTip()
 {
-    if (isSignalConnected(QMetaMethod::fromSignal(&KSSLider::signalDrawTip))) {
+    if (isSignalConnected(QMetaMethod::fromSignal(&KSSLider::signalDrawTip)))
         Q_EMIT signalDrawTip(this);
-    } else {
+    else
         DrawTipText(QString::number(sliderPosition()));
-    }
 }
 
 void KSSLider::DrawTipText(const QString& text)
@@ -134,13 +133,12 @@ void KSSLider::sendMouse(QEvent::Type type)
 {
     QMouseEvent event =
         OneFinger::mouseEvent(type, m_finger.positionIn(this).toPoint(), m_finger.position().toPoint());
-    if (type == QEvent::MouseButtonPress) {
+    if (type == QEvent::MouseButtonPress)
         mousePressEvent(&event);
-    } else if (type == QEvent::MouseMove) {
+    else if (type == QEvent::MouseMove)
         mouseMoveEvent(&event);
-    } else {
+    else
         mouseReleaseEvent(&event);
-    }
 }
 
 void KSSLider::mousePressEvent(QMouseEvent* event)
@@ -186,11 +184,10 @@ void KSSLider::mouseReleaseEvent(QMouseEvent* event)
         event->ignore(); // another button was released while the left one is held
         return;
     }
-    if (m_dragging) {
+    if (m_dragging)
         event->accept();
-    } else {
+    else
         QSlider::mouseReleaseEvent(event);
-    }
     letGo();
 }
 
@@ -226,9 +223,8 @@ int KSSLider::valueAt(const QPoint& position) const
 
 void KSSLider::changeEvent(QEvent* event)
 {
-    if (event->type() == QEvent::EnabledChange && !isEnabled()) {
+    if (event->type() == QEvent::EnabledChange && !isEnabled())
         letGo();
-    }
     QSlider::changeEvent(event);
 }
 

@@ -62,11 +62,10 @@ void KSSliderStyle::drawComplexControl(ComplexControl control, const QStyleOptio
         QProxyStyle::drawComplexControl(control, option, painter, widget);
         return;
     }
-    if (isHorizontal(*slider)) {
+    if (isHorizontal(*slider))
         drawHorizantalSlider(*slider, *painter);
-    } else {
+    else
         drawVerticalSlider(*slider, *painter);
-    }
 }
 
 void KSSliderStyle::drawHorizantalSlider(const QStyleOptionSlider& option, QPainter& painter) const
@@ -90,23 +89,19 @@ void KSSliderStyle::drawGroove(const QStyleOptionSlider& option, QPainter& paint
     const NineSlice::Triple cells = isHorizontal(option)
                                         ? NineSlice::row(target, pieces[0].width(), pieces[2].width())
                                         : NineSlice::column(target, pieces[0].height(), pieces[2].height());
-    if (pieces[1].isNull()) {
+    if (pieces[1].isNull())
         painter.fillRect(target, PLAIN_GROOVE_COLOR);
-    }
-    for (std::size_t i = 0; i < pieces.size(); ++i) {
-        if (!pieces[i].isNull() && !cells[i].isEmpty()) {
+    for (std::size_t i = 0; i < pieces.size(); ++i)
+        if (!pieces[i].isNull() && !cells[i].isEmpty())
             painter.drawPixmap(cells[i], pieces[i]);
-        }
-    }
 }
 
 void KSSliderStyle::drawHandle(const QStyleOptionSlider& option, QPainter& painter) const
 {
     const QRect target = handleRect(option);
     std::size_t look = option.state & State_Sunken ? 1 : 0;
-    if (!(option.state & State_Enabled)) {
+    if (!(option.state & State_Enabled))
         look = 2;
-    }
     const QPixmap& picture = m_images.handle[look].isNull() ? m_images.handle[0] : m_images.handle[look];
     if (picture.isNull()) {
         painter.fillRect(target, PLAIN_COLOR);
@@ -121,14 +116,12 @@ void KSSliderStyle::drawHandle(const QStyleOptionSlider& option, QPainter& paint
 
 void KSSliderStyle::drawTick(const QStyleOptionSlider& option, QPainter& painter) const
 {
-    if (option.tickPosition == QSlider::NoTicks) {
+    if (option.tickPosition == QSlider::NoTicks)
         return;
-    }
     const qint64 range = qint64(option.maximum) - option.minimum;
     const qint64 interval = qMax<qint64>(option.tickInterval, 1);
-    if (range <= 0 || range / interval > MOST_TICKS) {
+    if (range <= 0 || range / interval > MOST_TICKS)
         return;
-    }
     const int across = isHorizontal(option) ? option.rect.height() : option.rect.width();
     for (qint64 value = option.minimum; value <= option.maximum; value += interval) {
         const QRect mark = tickRect(option, int(value));
@@ -145,9 +138,8 @@ void KSSliderStyle::drawTick(const QStyleOptionSlider& option, QPainter& painter
 
 QRect KSSliderStyle::tickRect(const QStyleOptionSlider& option, int value) const
 {
-    if (option.tickPosition == QSlider::NoTicks) {
+    if (option.tickPosition == QSlider::NoTicks)
         return QRect();
-    }
     QStyleOptionSlider at = option;
     at.sliderPosition = value;
     const QPoint center = handleRect(at).center();
@@ -190,9 +182,8 @@ QRect KSSliderStyle::subControlRect(ComplexControl control, const QStyleOptionCo
                                     SubControl subControl, const QWidget* widget) const
 {
     const auto* slider = qstyleoption_cast<const QStyleOptionSlider*>(option);
-    if (control != CC_Slider || slider == nullptr) {
+    if (control != CC_Slider || slider == nullptr)
         return QProxyStyle::subControlRect(control, option, subControl, widget);
-    }
     switch (subControl) {
     case SC_SliderHandle:
         return handleRect(*slider);

@@ -56,9 +56,8 @@ bool KSTabBar::isUpright() const
 
 void KSTabBar::setTabSizeHint(int index, const QSize& size)
 {
-    if (index < 0 || index >= m_sizes.size()) {
+    if (index < 0 || index >= m_sizes.size())
         return;
-    }
     m_sizes[index] = size;
     // The base class updates its layout only when a tab changes.
     setTabText(index, tabText(index) + QLatin1Char(' '));
@@ -84,9 +83,8 @@ QSize KSTabBar::sizeHint() const
 {
     QSize size(0, 0);
     for (int i = 0; i < count(); ++i) {
-        if (!isTabVisible(i)) {
+        if (!isTabVisible(i))
             continue;
-        }
         const QSize tab = tabSizeHint(i);
         size = isUpright() ? QSize(qMax(size.width(), tab.width()), size.height() + tab.height())
                            : QSize(size.width() + tab.width(), qMax(size.height(), tab.height()));
@@ -103,9 +101,8 @@ void KSTabBar::tabInserted(int index)
 
 void KSTabBar::tabRemoved(int index)
 {
-    if (index >= 0 && index < m_sizes.size()) {
+    if (index >= 0 && index < m_sizes.size())
         m_sizes.removeAt(index);
-    }
     dropPress();
     QTabBar::tabRemoved(index);
 }
@@ -122,23 +119,20 @@ QPoint KSTabBar::fingerPosition() const
 
 void KSTabBar::mousePressEvent(QMouseEvent* event)
 {
-    if (event->button() == Qt::LeftButton && !m_finger.isDown()) {
+    if (event->button() == Qt::LeftButton && !m_finger.isDown())
         pressAt(event->position().toPoint());
-    }
 }
 
 void KSTabBar::mouseMoveEvent(QMouseEvent* event)
 {
-    if (!m_finger.isDown()) {
+    if (!m_finger.isDown())
         moveTo(event->position().toPoint());
-    }
 }
 
 void KSTabBar::mouseReleaseEvent(QMouseEvent* event)
 {
-    if (event->button() == Qt::LeftButton && !m_finger.isDown()) {
+    if (event->button() == Qt::LeftButton && !m_finger.isDown())
         releaseAt(event->position().toPoint());
-    }
 }
 
 void KSTabBar::hideEvent(QHideEvent* event)
@@ -171,9 +165,8 @@ void KSTabBar::releaseAt(const QPoint& position)
     const int index = m_pressedTab;
     m_pressStart = -1;
     setPressedTab(-1);
-    if (index < 0) {
+    if (index < 0)
         return;
-    }
     setCurrentIndex(index);
     Q_EMIT tabBarClicked(index);
 }

@@ -71,13 +71,12 @@ void KSTabStyle::drawControl(ControlElement element, const QStyleOption* option,
                              const QWidget* widget) const
 {
     const auto* tab = qstyleoption_cast<const QStyleOptionTab*>(option);
-    if (tab != nullptr && element == CE_TabBarTabShape) {
+    if (tab != nullptr && element == CE_TabBarTabShape)
         drawTabBarShape(*tab, *painter, widget);
-    } else if (tab != nullptr && element == CE_TabBarTabLabel) {
+    else if (tab != nullptr && element == CE_TabBarTabLabel)
         drawTabBarLabel(*tab, *painter);
-    } else {
+    else
         KSCommonStyle::drawControl(element, option, painter, widget);
-    }
 }
 
 void KSTabStyle::drawPrimitive(PrimitiveElement element, const QStyleOption* option, QPainter* painter,
@@ -117,24 +116,21 @@ void KSTabStyle::drawTabBarShape(const QStyleOptionTab& option, QPainter& painte
                                  const QWidget* widget) const
 {
     Look look = Rest;
-    if (!(option.state & State_Enabled)) {
+    if (!(option.state & State_Enabled))
         look = Disabled;
-    } else if (option.state & State_Selected) {
+    else if (option.state & State_Selected)
         look = Selected;
-    } else if (isPressed(option, widget)) {
+    else if (isPressed(option, widget))
         look = Pressed;
-    }
     const auto& pieces = m_pictures[look];
     painter.save();
     painter.setRenderHint(QPainter::SmoothPixmapTransform);
     QRect rect = option.rect;
     turn(painter, option.shape, rect);
     const NineSlice::Triple cells = NineSlice::row(rect, pieces[0].width(), pieces[2].width());
-    for (std::size_t i = 0; i < pieces.size(); ++i) {
-        if (!pieces[i].isNull() && !cells[i].isEmpty()) {
+    for (std::size_t i = 0; i < pieces.size(); ++i)
+        if (!pieces[i].isNull() && !cells[i].isEmpty())
             painter.drawPixmap(cells[i], pieces[i]);
-        }
-    }
     painter.restore();
 }
 
@@ -144,9 +140,8 @@ void KSTabStyle::drawTabBarLabel(const QStyleOptionTab& option, QPainter& painte
     painter.save();
     QRect rect = option.rect;
     if (option.shape == QTabBar::RoundedWest || option.shape == QTabBar::TriangularWest ||
-        option.shape == QTabBar::RoundedEast || option.shape == QTabBar::TriangularEast) {
+        option.shape == QTabBar::RoundedEast || option.shape == QTabBar::TriangularEast)
         turn(painter, option.shape, rect);
-    }
     QRect area = rect.adjusted(MARGIN, 0, -MARGIN, 0);
     drawTabBarPixmap(option, painter, area);
     const bool selected = option.state & State_Selected;
@@ -161,9 +156,8 @@ void KSTabStyle::drawTabBarLabel(const QStyleOptionTab& option, QPainter& painte
 // Draws the icon and removes its space from the area.
 void KSTabStyle::drawTabBarPixmap(const QStyleOptionTab& option, QPainter& painter, QRect& area) const
 {
-    if (option.icon.isNull()) {
+    if (option.icon.isNull())
         return;
-    }
     const QSize size = option.iconSize.isValid() ? option.iconSize : QSize(32, 32);
     const QRect place(QPoint(area.x(), area.y() + (area.height() - size.height()) / 2), size);
     option.icon.paint(&painter, place, Qt::AlignCenter,

@@ -73,9 +73,8 @@ void KSToolTip::showTextForTreeView(const QRect& row, const QString& text, int s
 
 void KSToolTip::hideText()
 {
-    if (s_KsToolTip != nullptr && s_KsToolTip->m_window != nullptr) {
+    if (s_KsToolTip != nullptr && s_KsToolTip->m_window != nullptr)
         s_KsToolTip->m_window->hide();
-    }
     s_LongText.clear();
 }
 
@@ -102,11 +101,10 @@ void KSToolTip::show(const QRect& anchor, const QString& text, bool below)
     {
         QPainter painter(&picture);
         const QRect body = MenuPlacement::background(size, placement.side);
-        if (placement.side == MenuPlacement::ArrowSide::Top) {
+        if (placement.side == MenuPlacement::ArrowSide::Top)
             paintTop(painter, body, shown);
-        } else {
+        else
             paintBottom(painter, body, shown);
-        }
     }
     if (m_window == nullptr || m_window->parentWidget() != s_mainWindow) {
         delete m_window;

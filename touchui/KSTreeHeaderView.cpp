@@ -63,20 +63,18 @@ void KSTreeHeaderView::sendMouse(QEvent::Type type, const QPointF& globalPositio
 {
     QMouseEvent mouse =
         OneFinger::mouseEvent(type, viewport()->mapFromGlobal(globalPosition), globalPosition);
-    if (type == QEvent::MouseButtonPress) {
+    if (type == QEvent::MouseButtonPress)
         mousePressEvent(&mouse);
-    } else if (type == QEvent::MouseButtonRelease) {
+    else if (type == QEvent::MouseButtonRelease)
         mouseReleaseEvent(&mouse);
-    } else {
+    else
         mouseMoveEvent(&mouse);
-    }
 }
 
 void KSTreeHeaderView::paintSection(QPainter* painter, const QRect& rect, int logicalIndex) const
 {
-    if (!rect.isValid()) {
+    if (!rect.isValid())
         return;
-    }
     QStyleOptionHeader option;
     initStyleOption(&option);
     option.rect = rect;

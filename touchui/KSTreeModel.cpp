@@ -73,21 +73,18 @@ void KSTreeModel::createDataItems()
 {
     beginResetModel();
     createRoot();
-    if (m_factory != nullptr) {
+    if (m_factory != nullptr)
         m_factory->importSourceData();
-    }
     fillChildren(m_root.get());
     endResetModel();
 }
 
 int KSTreeModel::createTreeItemChildren(KSModelItem* item)
 {
-    if (item == nullptr) {
+    if (item == nullptr)
         return 0;
-    }
-    if (!item->dataItem()->isChildrenCreated()) {
+    if (!item->dataItem()->isChildrenCreated())
         fillChildren(item);
-    }
     return item->childCount();
 }
 
@@ -96,17 +93,15 @@ std::vector<std::unique_ptr<KSModelItem>> KSTreeModel::makeChildren(KSModelItem*
 {
     std::vector<std::unique_ptr<KSModelItem>> children;
     void* source = item->dataItem()->getSourceData();
-    if (m_factory == nullptr || (source == nullptr && item != m_root.get())) {
+    if (m_factory == nullptr || (source == nullptr && item != m_root.get()))
         return children;
-    }
     const bool checked = item->attributes()->getAttribute(Qt::CheckStateRole, 0).toInt() == Qt::Checked;
     for (void* node = m_factory->getChildNode(source); node != nullptr; node = m_factory->getNextNode(node)) {
         std::unique_ptr<KSModelItem> child = createItem();
         child->dataItem()->setSourceData(node);
         m_factory->InstallItemAttribute(child->attributes(), node);
-        if (checked) {
+        if (checked)
             child->attributes()->setAttribute(Qt::CheckStateRole, static_cast<int>(Qt::Checked), 0);
-        }
         children.push_back(std::move(child));
     }
     return children;
@@ -115,35 +110,29 @@ std::vector<std::unique_ptr<KSModelItem>> KSTreeModel::makeChildren(KSModelItem*
 void KSTreeModel::fillChildren(KSModelItem* item)
 {
     item->dataItem()->setChildrenCreated(true);
-    for (auto& child : makeChildren(item)) {
+    for (auto& child : makeChildren(item))
         item->addChild(std::move(child));
-    }
-    if (m_sortColumn >= 0) {
+    if (m_sortColumn >= 0)
         sortChildren(item, false);
-    }
 }
 
 void KSTreeModel::setSourceData(const QModelIndex& index, void* source)
 {
     KSModelItem* item = itemOf(index);
-    if (item == nullptr) {
+    if (item == nullptr)
         return;
-    }
     const QModelIndex first = index.siblingAtColumn(0);
-    if (item->childCount() > 0) {
+    if (item->childCount() > 0)
         removeRows(0, item->childCount(), first);
-    }
     item->dataItem()->setSourceData(source);
     item->dataItem()->setChildrenCreated(true);
     auto children = makeChildren(item);
     if (!children.empty()) {
         beginInsertRows(first, 0, static_cast<int>(children.size()) - 1);
-        for (auto& child : children) {
+        for (auto& child : children)
             item->addChild(std::move(child));
-        }
-        if (m_sortColumn >= 0) {
+        if (m_sortColumn >= 0)
             sortChildren(item, false);
-        }
         endInsertRows();
     }
 }
@@ -166,9 +155,8 @@ KSModelItem* KSTreeModel::itemOrRoot(const QModelIndex& index) const
 QModelIndex KSTreeModel::indexOf(KSModelItem* item, int column) const
 {
     if (item == nullptr || item == m_currentRoot || item->parent() == nullptr || column < 0 ||
-        column >= m_columnCount) {
+        column >= m_columnCount)
         return QModelIndex();
-    }
     return createIndex(item->parent()->indexOfChildList(item), column, item);
 }
 
@@ -200,9 +188,8 @@ QVariant KSTreeModel::getHeaderAttribute(int role) const
 void KSTreeModel::setHeaderAttribute(int role, const QVariant& value)
 {
     m_headerAttributes.insert(role, value);
-    if (m_columnCount > 0) {
+    if (m_columnCount > 0)
         Q_EMIT headerDataChanged(Qt::Horizontal, 0, m_columnCount - 1);
-    }
 }
 
 QColor KSTreeModel::getHeaderTextColor(int section) const
@@ -250,11 +237,9 @@ QModelIndexList KSTreeModel::madeIndexesWith(int role) const
 {
     QModelIndexList found;
     const QList<KSModelItem*> items = m_root->children(true);
-    for (KSModelItem* item : items) {
-        if (item->attributes()->getAttribute(role, 0).toInt() != 0) {
+    for (KSModelItem* item : items)
+        if (item->attributes()->getAttribute(role, 0).toInt() != 0)
             found.append(indexOf(item));
-        }
-    }
     return found;
 }
 
@@ -262,9 +247,8 @@ void KSTreeModel::setAttributeOfAll(int role, const QVariant& value)
 {
     const QList<KSModelItem*> items = m_root->children(true);
     for (KSModelItem* item : items) {
-        if (!item->attributes()->getAttribute(role, 0).isValid()) {
+        if (!item->attributes()->getAttribute(role, 0).isValid())
             continue;
-        }
         item->attributes()->setAttribute(role, value, 0);
         const QModelIndex changed = indexOf(item);
         Q_EMIT dataChanged(changed, changed.siblingAtColumn(m_columnCount - 1), {role});
@@ -273,9 +257,8 @@ void KSTreeModel::setAttributeOfAll(int role, const QVariant& value)
 
 QModelIndex KSTreeModel::index(int row, int column, const QModelIndex& parent) const
 {
-    if (column < 0 || column >= m_columnCount || row < 0 || row >= rowCount(parent)) {
+    if (column < 0 || column >= m_columnCount || row < 0 || row >= rowCount(parent))
         return QModelIndex();
-    }
     return createIndex(row, column, itemOrRoot(parent)->child(row));
 }
 
@@ -301,12 +284,10 @@ int KSTreeModel::columnCount(const QModelIndex&) const
 bool KSTreeModel::hasChildren(const QModelIndex& parent) const
 {
     KSModelItem* item = itemOrRoot(parent);
-    if (item == nullptr || parent.column() > 0 || m_columnCount == 0) {
+    if (item == nullptr || parent.column() > 0 || m_columnCount == 0)
         return false;
-    }
-    if (item->dataItem()->isChildrenCreated()) {
+    if (item->dataItem()->isChildrenCreated())
         return item->childCount() > 0;
-    }
     void* source = item->dataItem()->getSourceData();
     return m_factory != nullptr && (source != nullptr || item == m_root.get()) &&
            m_factory->hasChildNode(source);
@@ -315,16 +296,14 @@ bool KSTreeModel::hasChildren(const QModelIndex& parent) const
 QVariant KSTreeModel::data(const QModelIndex& index, int role) const
 {
     KSModelItem* item = itemOf(index);
-    if (item == nullptr) {
+    if (item == nullptr)
         return QVariant();
-    }
     const auto value = [&](int which) {
         const QVariant own = item->attributes()->getAttribute(which, index.column());
         return own.isValid() ? own : getDefaultAttribute(which, index.column());
     };
-    if (role == Qt::CheckStateRole && !value(KSVIEW::ItemCheckableRole).toBool()) {
+    if (role == Qt::CheckStateRole && !value(KSVIEW::ItemCheckableRole).toBool())
         return QVariant(); // no check box is drawn for an invalid value
-    }
     const QVariant found = value(role);
     return role == Qt::EditRole && !found.isValid() ? value(Qt::DisplayRole) : found;
 }
@@ -332,9 +311,8 @@ QVariant KSTreeModel::data(const QModelIndex& index, int role) const
 bool KSTreeModel::setData(const QModelIndex& index, const QVariant& value, int role)
 {
     KSModelItem* item = itemOf(index);
-    if (item == nullptr) {
+    if (item == nullptr)
         return false;
-    }
     QList<int> roles = {role};
     item->attributes()->setAttribute(role, value, index.column());
     if (role == Qt::EditRole) {
@@ -349,18 +327,16 @@ bool KSTreeModel::setData(const QModelIndex& index, const QVariant& value, int r
 
 QVariant KSTreeModel::headerData(int section, Qt::Orientation orientation, int role) const
 {
-    if (orientation != Qt::Horizontal || section < 0 || section >= m_columnCount) {
+    if (orientation != Qt::Horizontal || section < 0 || section >= m_columnCount)
         return QVariant();
-    }
     const QVariant own = m_headerData.value(section).value(role);
     return own.isValid() ? own : getHeaderAttribute(role);
 }
 
 bool KSTreeModel::setHeaderData(int section, Qt::Orientation orientation, const QVariant& value, int role)
 {
-    if (orientation != Qt::Horizontal || section < 0 || section >= m_columnCount) {
+    if (orientation != Qt::Horizontal || section < 0 || section >= m_columnCount)
         return false;
-    }
     m_headerData[section].insert(role == Qt::EditRole ? static_cast<int>(Qt::DisplayRole) : role, value);
     Q_EMIT headerDataChanged(orientation, section, section);
     return true;
@@ -368,9 +344,8 @@ bool KSTreeModel::setHeaderData(int section, Qt::Orientation orientation, const 
 
 Qt::ItemFlags KSTreeModel::flags(const QModelIndex& index) const
 {
-    if (itemOf(index) == nullptr) {
+    if (itemOf(index) == nullptr)
         return Qt::NoItemFlags;
-    }
     const auto has = [&](int role) { return data(index, role).toBool(); };
     Qt::ItemFlags flags = Qt::NoItemFlags;
     flags.setFlag(Qt::ItemIsEnabled, has(KSVIEW::ItemEnableRole));
@@ -385,13 +360,11 @@ Qt::ItemFlags KSTreeModel::flags(const QModelIndex& index) const
 bool KSTreeModel::insertRows(int row, int count, const QModelIndex& parent)
 {
     KSModelItem* item = itemOrRoot(parent);
-    if (item == nullptr || count < 1 || row < 0 || row > rowCount(parent)) {
+    if (item == nullptr || count < 1 || row < 0 || row > rowCount(parent))
         return false;
-    }
     beginInsertRows(parent, row, row + count - 1);
-    for (int i = 0; i < count; ++i) {
+    for (int i = 0; i < count; ++i)
         item->addChild(createItem(), row + i);
-    }
     endInsertRows();
     return true;
 }
@@ -399,15 +372,13 @@ bool KSTreeModel::insertRows(int row, int count, const QModelIndex& parent)
 bool KSTreeModel::removeRows(int row, int count, const QModelIndex& parent)
 {
     KSModelItem* item = itemOrRoot(parent);
-    if (item == nullptr || count < 1 || row < 0 || count > rowCount(parent) - row) {
+    if (item == nullptr || count < 1 || row < 0 || count > rowCount(parent) - row)
         return false;
-    }
     beginRemoveRows(parent, row, row + count - 1);
     // destroyed after endRemoveRows(), when no index refers to them
     std::vector<std::unique_ptr<KSModelItem>> removed;
-    for (int i = 0; i < count; ++i) {
+    for (int i = 0; i < count; ++i)
         removed.push_back(item->remove(row));
-    }
     endRemoveRows();
     return true;
 }
@@ -420,20 +391,16 @@ bool KSTreeModel::moveRows(const QModelIndex& sourceParent, int sourceRow, int c
     if (from == nullptr || to == nullptr || count < 1 || sourceRow < 0 ||
         count > rowCount(sourceParent) - sourceRow || destinationChild < 0 ||
         destinationChild > rowCount(destinationParent) ||
-        !beginMoveRows(sourceParent, sourceRow, sourceRow + count - 1, destinationParent, destinationChild)) {
+        !beginMoveRows(sourceParent, sourceRow, sourceRow + count - 1, destinationParent, destinationChild))
         return false;
-    }
     std::vector<std::unique_ptr<KSModelItem>> taken;
-    for (int i = 0; i < count; ++i) {
+    for (int i = 0; i < count; ++i)
         taken.push_back(from->remove(sourceRow));
-    }
     int row = destinationChild;
-    if (from == to && destinationChild > sourceRow) {
+    if (from == to && destinationChild > sourceRow)
         row -= count; // removing the rows has moved the destination
-    }
-    for (auto& item : taken) {
+    for (auto& item : taken)
         to->addChild(std::move(item), row++);
-    }
     endMoveRows();
     return true;
 }
@@ -442,16 +409,14 @@ void KSTreeModel::sort(int column, Qt::SortOrder order)
 {
     m_sortColumn = column < m_columnCount ? column : -1;
     m_sortOrder = order;
-    if (m_sortColumn < 0) {
+    if (m_sortColumn < 0)
         return;
-    }
     Q_EMIT layoutAboutToBeChanged({}, QAbstractItemModel::VerticalSortHint);
     const QModelIndexList before = persistentIndexList();
     sortChildren(m_root.get(), true);
     QModelIndexList after;
-    for (const QModelIndex& index : before) {
+    for (const QModelIndex& index : before)
         after.append(indexOf(itemOf(index), index.column()));
-    }
     changePersistentIndexList(before, after);
     Q_EMIT layoutChanged({}, QAbstractItemModel::VerticalSortHint);
 }
@@ -459,17 +424,14 @@ void KSTreeModel::sort(int column, Qt::SortOrder order)
 void KSTreeModel::sortChildren(KSModelItem* item, bool deep)
 {
     QList<KSModelItem*> list = item->children(false);
-    if (list.isEmpty()) {
+    if (list.isEmpty())
         return;
-    }
     useSortHelper(m_sortColumn, m_sortOrder, list);
     rankFileAndForder(list, true);
     item->orderChildList(list);
-    if (deep) {
-        for (KSModelItem* child : std::as_const(list)) {
+    if (deep)
+        for (KSModelItem* child : std::as_const(list))
             sortChildren(child, true);
-        }
-    }
 }
 
 void KSTreeModel::useSortHelper(int column, Qt::SortOrder order, QList<KSModelItem*>& list)
@@ -488,9 +450,8 @@ void KSTreeModel::rankFileAndForder(QList<KSModelItem*>& list, bool filesFirst)
 
 bool KSTreeModel::insertColumns(int column, int count, const QModelIndex& parent)
 {
-    if (column < 0 || column > m_columnCount || count < 1 || itemOrRoot(parent) == nullptr) {
+    if (column < 0 || column > m_columnCount || count < 1 || itemOrRoot(parent) == nullptr)
         return false;
-    }
     beginInsertColumns(QModelIndex(), column, column + count - 1);
     changeColumns(column, 0, count);
     endInsertColumns();
@@ -499,9 +460,8 @@ bool KSTreeModel::insertColumns(int column, int count, const QModelIndex& parent
 
 bool KSTreeModel::removeColumns(int column, int count, const QModelIndex& parent)
 {
-    if (column < 0 || count < 1 || count > m_columnCount - column || itemOrRoot(parent) == nullptr) {
+    if (column < 0 || count < 1 || count > m_columnCount - column || itemOrRoot(parent) == nullptr)
         return false;
-    }
     if (column == 0) {
         // The rows below are children of the first column, so their indices do not survive. Reset the model.
         beginResetModel();
@@ -523,9 +483,8 @@ void KSTreeModel::changeColumns(int column, int removed, int inserted)
     QModelIndexList after;
     const QModelIndexList persistent = persistentIndexList();
     for (const QModelIndex& index : persistent) {
-        if (!index.parent().isValid() || index.column() < column) {
+        if (!index.parent().isValid() || index.column() < column)
             continue;
-        }
         before.append(index);
         const bool gone = index.column() < column + removed;
         after.append(
@@ -534,21 +493,17 @@ void KSTreeModel::changeColumns(int column, int removed, int inserted)
     }
     changePersistentIndexList(before, after);
     const QList<KSModelItem*> items = m_root->children(true);
-    for (KSModelItem* item : items) {
-        if (removed > 0) {
+    for (KSModelItem* item : items)
+        if (removed > 0)
             item->attributes()->removeAttributeColumns(column, removed);
-        } else {
+        else
             item->attributes()->insertAttributeColumns(column, inserted);
-        }
-    }
     QMap<int, QMap<int, QVariant>> headers;
-    for (auto it = m_headerData.cbegin(); it != m_headerData.cend(); ++it) {
-        if (it.key() < column) {
+    for (auto it = m_headerData.cbegin(); it != m_headerData.cend(); ++it)
+        if (it.key() < column)
             headers.insert(it.key(), it.value());
-        } else if (it.key() >= column + removed) {
+        else if (it.key() >= column + removed)
             headers.insert(it.key() - removed + inserted, it.value());
-        }
-    }
     m_headerData = headers;
     m_columnCount += inserted - removed;
     m_sortColumn = -1; // the sort column may have moved

@@ -54,13 +54,11 @@ KSTreeModelDefaultSortHelper::KSTreeModelDefaultSortHelper(QObject* parent) : KS
 void KSTreeModelDefaultSortHelper::sortChildList(int dataType, int sortKind, QList<KSModelItem*>& list,
                                                  Qt::SortOrder order)
 {
-    if (list.isEmpty()) {
+    if (list.isEmpty())
         return;
-    }
     KSModelItem* parent = list.constFirst()->parent();
-    if (parent == nullptr || !parent->attributes()->getAttribute(KSVIEW::ItemIsForderRole, 0).toBool()) {
+    if (parent == nullptr || !parent->attributes()->getAttribute(KSVIEW::ItemIsForderRole, 0).toBool())
         return;
-    }
     for (const SortRow& row : SORT_TABLE) {
         if (row.dataType == dataType && row.sortKind == sortKind) {
             std::stable_sort(list.begin(), list.end(),

@@ -76,9 +76,8 @@ void KSTreeView::initScrollBars()
 {
     setVerticalScrollBar(new KSScrollBar(Qt::Vertical, this));
     setHorizontalScrollBar(new KSScrollBar(Qt::Horizontal, this));
-    for (QScrollBar* bar : {verticalScrollBar(), horizontalScrollBar()}) {
+    for (QScrollBar* bar : {verticalScrollBar(), horizontalScrollBar()})
         bar->setStyleSheet(QLatin1String(SCROLL_BAR_STYLE));
-    }
     setHorizontalScrollBarPolicy(Qt::ScrollBarAlwaysOff);
 }
 
@@ -159,13 +158,11 @@ bool KSTreeView::moveToSibling(QModelIndex sibling)
 {
     const QModelIndex current = currentIndex();
     if (!current.isValid() || !sibling.isValid() || sibling.model() != model() ||
-        current.parent() != sibling.parent()) {
+        current.parent() != sibling.parent())
         return false;
-    }
     const int behind = sibling.row() + 1;
-    if (behind == current.row() || behind == current.row() + 1) {
+    if (behind == current.row() || behind == current.row() + 1)
         return true; // it is there already, or it is the sibling itself
-    }
     return model()->moveRow(current.parent(), current.row(), sibling.parent(), behind);
 }
 
@@ -196,9 +193,8 @@ QRect KSTreeView::getCheckBoxRect(const QModelIndex& index) const
 QRect KSTreeView::getCheckBoxRectForTouch(const QModelIndex& index) const
 {
     const QRect box = getCheckBoxRect(index);
-    if (box.isNull()) {
+    if (box.isNull())
         return QRect();
-    }
     const QRect row = getIndexVisualRect(index);
     const int margin = getDesignAttribute(KSVIEW::DesignItemSpacing).toInt() / 2;
     return QRect(box.left() - margin, row.top(), box.width() + 2 * margin, row.height());
@@ -207,18 +203,16 @@ QRect KSTreeView::getCheckBoxRectForTouch(const QModelIndex& index) const
 QRect KSTreeView::getIndicatorRect(const QModelIndex& index) const
 {
     const QRect cell = firstCellRect(index);
-    if (!cell.isValid() || !model()->hasChildren(index.siblingAtColumn(0))) {
+    if (!cell.isValid() || !model()->hasChildren(index.siblingAtColumn(0)))
         return QRect();
-    }
     return getLayoutForFirstColumn(cell, index).indicator;
 }
 
 QRect KSTreeView::indicatorRectForTouch(const QModelIndex& index) const
 {
     const QRect indicator = getIndicatorRect(index);
-    if (indicator.isNull()) {
+    if (indicator.isNull())
         return QRect();
-    }
     const QRect row = getIndexVisualRect(index);
     const int width = getDesignAttribute(KSVIEW::DesignIndentation).toInt();
     return QRect(indicator.center().x() - width / 2, row.top(), width, row.height());
@@ -238,14 +232,12 @@ QRect KSTreeView::getEmptyArea() const
         for (;;) {
             const bool open = last == rootIndex() || isExpanded(last);
             const int rows = open ? model()->rowCount(last) : 0;
-            if (rows == 0) {
+            if (rows == 0)
                 break;
-            }
             last = model()->index(rows - 1, 0, last);
         }
-        if (last != rootIndex()) {
+        if (last != rootIndex())
             top = visualRect(last).bottom() + 1;
-        }
     }
     return top < viewport()->height() ? QRect(0, top, viewport()->width(), viewport()->height() - top)
                                       : QRect();
@@ -254,18 +246,16 @@ QRect KSTreeView::getEmptyArea() const
 bool KSTreeView::isTextElide(const QModelIndex& index) const
 {
     const QRect cell = visualRect(index);
-    if (!cell.isValid()) {
+    if (!cell.isValid())
         return false;
-    }
     const QRect text =
         index.column() == 0 ? getLayoutForFirstColumn(cell, index).text : m_viewStyle->textRect(cell);
     QStyleOptionViewItem option;
     initViewItemOption(&option);
     option.index = index;
     const QVariant font = index.data(Qt::FontRole);
-    if (font.isValid()) {
+    if (font.isValid())
         option.font = qvariant_cast<QFont>(font).resolve(option.font);
-    }
     return QFontMetrics(m_viewStyle->itemFont(option))
                .horizontalAdvance(index.data(Qt::DisplayRole).toString()) > text.width();
 }
@@ -283,9 +273,8 @@ void KSTreeView::drawOnEmptyArea(QPainter* painter)
 {
     const QRect area = getEmptyArea();
     const int height = getDesignAttribute(KSVIEW::DesignRowHeight).toInt();
-    for (int y = area.top(); !area.isNull() && height > 0 && y <= area.bottom(); y += height) {
+    for (int y = area.top(); !area.isNull() && height > 0 && y <= area.bottom(); y += height)
         drawEmptyRow(painter, QRect(area.left(), y, area.width(), height));
-    }
 }
 
 void KSTreeView::drawEmptyRow(QPainter* painter, const QRect& rect)
@@ -299,22 +288,19 @@ void KSTreeView::drawRow(QPainter* painter, const QStyleOptionViewItem& option,
     const QRect row(0, option.rect.top(), viewport()->width(), option.rect.height());
     const bool selected =
         selectionModel() != nullptr && selectionModel()->isRowSelected(index.row(), index.parent());
-    if (selected) {
+    if (selected)
         m_viewStyle->drawSelectedBackground(painter, row);
-    }
     QTreeView::drawRow(painter, option, index);
     m_viewStyle->drawHorizontalSeparator(painter, row);
     if (m_renameIndex.isValid() && m_renameIndex.row() == index.row() &&
-        m_renameIndex.parent() == index.parent()) {
+        m_renameIndex.parent() == index.parent())
         m_viewStyle->drawOperationFocus(painter, row);
-    }
 }
 
 void KSTreeView::drawBranches(QPainter* painter, const QRect&, const QModelIndex& index) const
 {
-    if (!model()->hasChildren(index)) {
+    if (!model()->hasChildren(index))
         return;
-    }
     QStyleOption option;
     option.rect = getIndicatorRect(index);
     option.state = QStyle::State_Children;
@@ -339,9 +325,8 @@ bool KSTreeView::isIndicatorPressed(const QModelIndex& index) const
 bool KSTreeView::edit(const QModelIndex& index, EditTrigger trigger, QEvent* event)
 {
     const bool opened = QTreeView::edit(index, trigger, event);
-    if (opened && state() == QAbstractItemView::EditingState) {
+    if (opened && state() == QAbstractItemView::EditingState)
         setRenameIndex(index);
-    }
     return opened;
 }
 
@@ -359,12 +344,10 @@ void KSTreeView::closeEditor(QWidget* editor, QAbstractItemDelegate::EndEditHint
 
 void KSTreeView::closeEditorState(QWidget* editor, QAbstractItemDelegate::EndEditHint hint)
 {
-    if (editor == nullptr || editor->parentWidget() != viewport() || !m_renameIndex.isValid()) {
+    if (editor == nullptr || editor->parentWidget() != viewport() || !m_renameIndex.isValid())
         return;
-    }
-    if (hint != QAbstractItemDelegate::RevertModelCache) {
+    if (hint != QAbstractItemDelegate::RevertModelCache)
         commitData(editor);
-    }
     closeEditor(editor, hint);
 }
 
@@ -410,41 +393,36 @@ KSTreeView::CheckBoxImage KSTreeView::getCheckBoxImageType(const QModelIndex& in
         break;
     }
     int state = 0;
-    if (!isUsable(index)) {
+    if (!isUsable(index))
         state = OnDisabled;
-    } else if (m_pressedCheckBox.isValid() && m_pressedCheckBox == index.siblingAtColumn(0)) {
+    else if (m_pressedCheckBox.isValid() && m_pressedCheckBox == index.siblingAtColumn(0))
         state = OnPressed;
-    }
     return static_cast<CheckBoxImage>(family + state);
 }
 
 void KSTreeView::changeCheckState(const QModelIndex& index)
 {
     const QModelIndex first = index.siblingAtColumn(0);
-    if (m_treeModel != nullptr && isUsable(first) && m_treeModel->getCheckable(first)) {
+    if (m_treeModel != nullptr && isUsable(first) && m_treeModel->getCheckable(first))
         TreeCheckStates(*m_treeModel).toggle(first);
-    }
 }
 
 void KSTreeView::changeChildrenCheckState(const QModelIndex& index, Qt::CheckState state)
 {
-    if (m_treeModel != nullptr) {
+    if (m_treeModel != nullptr)
         TreeCheckStates(*m_treeModel).setChildren(index, state);
-    }
 }
 
 void KSTreeView::changeParentsCheckState(const QModelIndex& index)
 {
-    if (m_treeModel != nullptr) {
+    if (m_treeModel != nullptr)
         TreeCheckStates(*m_treeModel).updateParents(index);
-    }
 }
 
 void KSTreeView::changeCheckStateByNumber(const QModelIndex& index, int number)
 {
-    if (m_treeModel != nullptr) {
+    if (m_treeModel != nullptr)
         TreeCheckStates(*m_treeModel).setByNumber(index, number);
-    }
 }
 
 void KSTreeView::setCheckBoxVisible(bool visible)
@@ -465,9 +443,8 @@ void KSTreeView::dataChanged(const QModelIndex& topLeft, const QModelIndex& bott
                              const QList<int>& roles)
 {
     QTreeView::dataChanged(topLeft, bottomRight, roles);
-    if (roles.contains(KSVIEW::ItemLoadingRole) && topLeft.data(KSVIEW::ItemLoadingRole).toInt() > 0) {
+    if (roles.contains(KSVIEW::ItemLoadingRole) && topLeft.data(KSVIEW::ItemLoadingRole).toInt() > 0)
         m_loadingMarks.start();
-    }
 }
 
 void KSTreeView::slotUpdateLoadingIcon()
@@ -478,16 +455,14 @@ void KSTreeView::slotUpdateLoadingIcon()
 void KSTreeView::clearAllLoadingState()
 {
     m_loadingMarks.stop();
-    if (m_treeModel != nullptr) {
+    if (m_treeModel != nullptr)
         m_treeModel->setAttributeOfAll(KSVIEW::ItemLoadingRole, 0);
-    }
 }
 
 void KSTreeView::clearRecording()
 {
-    if (m_treeModel != nullptr) {
+    if (m_treeModel != nullptr)
         m_treeModel->setAttributeOfAll(KSVIEW::ItemRecordingRole, false);
-    }
 }
 
 void KSTreeView::showElidedText(const QModelIndex& index)
@@ -504,17 +479,15 @@ void KSTreeView::showElidedText(const QModelIndex& index)
 
 bool KSTreeView::event(QEvent* event)
 {
-    if (OneFinger::isTouch(event)) {
+    if (OneFinger::isTouch(event))
         return onTouchEvent(static_cast<QTouchEvent*>(event));
-    }
     return event->type() == QEvent::Gesture || QTreeView::event(event);
 }
 
 bool KSTreeView::viewportEvent(QEvent* event)
 {
-    if (OneFinger::isTouch(event)) {
+    if (OneFinger::isTouch(event))
         return onTouchEvent(static_cast<QTouchEvent*>(event));
-    }
     return event->type() == QEvent::Gesture || QTreeView::viewportEvent(event);
 }
 
@@ -544,9 +517,8 @@ bool KSTreeView::onTouchBeginEvent(QTouchEvent*)
     const QPoint point = fingerPosition();
     const bool brake = isAutoFilck();
     m_flicker.begin(point);
-    if (!brake) {
+    if (!brake)
         sendMouse(QEvent::MouseButtonPress, point);
-    }
     return true;
 }
 
@@ -582,13 +554,12 @@ void KSTreeView::sendMouse(QEvent::Type type, const QPoint& point)
 {
     QMouseEvent mouse = OneFinger::mouseEvent(type, point, viewport()->mapToGlobal(point));
     m_sendingMouse = true;
-    if (type == QEvent::MouseButtonPress) {
+    if (type == QEvent::MouseButtonPress)
         mousePressEvent(&mouse);
-    } else if (type == QEvent::MouseButtonRelease) {
+    else if (type == QEvent::MouseButtonRelease)
         mouseReleaseEvent(&mouse);
-    } else {
+    else
         mouseMoveEvent(&mouse);
-    }
     m_sendingMouse = false;
 }
 
@@ -598,15 +569,13 @@ void KSTreeView::mousePressEvent(QMouseEvent* event)
 {
     event->accept();
     const QPoint point = event->position().toPoint();
-    if (event->button() != Qt::LeftButton || (!m_sendingMouse && m_finger.isDown())) {
+    if (event->button() != Qt::LeftButton || (!m_sendingMouse && m_finger.isDown()))
         return;
-    }
     if (!m_sendingMouse) {
         const bool brake = isAutoFilck();
         m_flicker.begin(point);
-        if (brake) {
+        if (brake)
             return;
-        }
     }
     beginPress(point);
 }
@@ -615,12 +584,10 @@ void KSTreeView::mouseMoveEvent(QMouseEvent* event)
 {
     event->accept();
     const QPoint point = event->position().toPoint();
-    if (!m_sendingMouse && (event->buttons() & Qt::LeftButton) && !m_finger.isDown()) {
+    if (!m_sendingMouse && (event->buttons() & Qt::LeftButton) && !m_finger.isDown())
         m_flicker.follow(point);
-    }
-    if (m_pressState == NotPressed) {
+    if (m_pressState == NotPressed)
         return;
-    }
     if ((point - m_pressPoint).manhattanLength() > QApplication::startDragDistance()) {
         m_finger.stopHold();
         m_moved = true;
@@ -639,17 +606,14 @@ void KSTreeView::mouseReleaseEvent(QMouseEvent* event)
 {
     event->accept();
     const QPoint point = event->position().toPoint();
-    if (event->button() != Qt::LeftButton || (!m_sendingMouse && m_finger.isDown())) {
+    if (event->button() != Qt::LeftButton || (!m_sendingMouse && m_finger.isDown()))
         return;
-    }
-    if (!m_sendingMouse) {
+    if (!m_sendingMouse)
         m_flicker.lift(point);
-    }
     const bool isTap = m_pressState == Pressed && !m_moved &&
                        (point - m_pressPoint).manhattanLength() <= QApplication::startDragDistance();
-    if (isTap) {
+    if (isTap)
         tap(point);
-    }
     cancelPress();
 }
 
@@ -665,17 +629,15 @@ void KSTreeView::beginPress(const QPoint& point)
     m_pressPoint = point;
     const QModelIndex index = indexAt(point);
     m_pressIndex = index;
-    if (!isUsable(index)) {
+    if (!isUsable(index))
         return;
-    }
     const QModelIndex first = index.siblingAtColumn(0);
-    if (getCheckBoxRectForTouch(first).contains(point)) {
+    if (getCheckBoxRectForTouch(first).contains(point))
         m_pressedCheckBox = first;
-    } else if (indicatorRectForTouch(first).contains(point)) {
+    else if (indicatorRectForTouch(first).contains(point))
         m_pressedIndicator = first;
-    } else {
+    else
         m_finger.startHold(m_holdInterval);
-    }
     viewport()->update();
 }
 
@@ -695,21 +657,17 @@ void KSTreeView::tap(const QPoint& point)
 {
     const QPersistentModelIndex index = m_pressIndex;
     if (m_pressedCheckBox.isValid()) {
-        if (getCheckBoxRectForTouch(m_pressedCheckBox).contains(point)) {
+        if (getCheckBoxRectForTouch(m_pressedCheckBox).contains(point))
             changeCheckState(m_pressedCheckBox);
-        }
     } else if (m_pressedIndicator.isValid()) {
-        if (indicatorRectForTouch(m_pressedIndicator).contains(point)) {
+        if (indicatorRectForTouch(m_pressedIndicator).contains(point))
             setExpanded(m_pressedIndicator, !isExpanded(m_pressedIndicator));
-        }
     } else if (isUsable(index)) {
         makeCurrent(index);
-        if (index.isValid()) {
+        if (index.isValid())
             Q_EMIT signalCurrentChangedByTouch(index);
-        }
-        if (index.isValid()) {
+        if (index.isValid())
             Q_EMIT clicked(index);
-        }
     }
 }
 
@@ -717,25 +675,21 @@ void KSTreeView::makeCurrent(const QModelIndex& index)
 {
     const QPersistentModelIndex kept = index;
     setCurrentIndex(index);
-    if (kept.isValid()) {
+    if (kept.isValid())
         Q_EMIT pressed(kept);
-    }
 }
 
 void KSTreeView::slotHold()
 {
-    if (m_pressState != Pressed || !isUsable(m_pressIndex)) {
+    if (m_pressState != Pressed || !isUsable(m_pressIndex))
         return;
-    }
     m_pressState = Held;
     const QPersistentModelIndex index = m_pressIndex;
     makeCurrent(index);
-    if (index.isValid() && isTextElide(index)) {
+    if (index.isValid() && isTextElide(index))
         showElidedText(index);
-    }
-    if (index.isValid()) {
+    if (index.isValid())
         Q_EMIT signalPressedAndHold(index);
-    }
 }
 
 // --- Motion -------------------------------------------------------------------------------------------
@@ -749,9 +703,8 @@ void KSTreeView::motionStarted()
 
 void KSTreeView::showLastRowWhole()
 {
-    if (verticalScrollBar()->value() == verticalScrollBar()->maximum()) {
+    if (verticalScrollBar()->value() == verticalScrollBar()->maximum())
         scrollToBottom();
-    }
 }
 
 QPoint KSTreeView::getDistance()

@@ -58,13 +58,11 @@ int KSViewStyle::length(int role) const
 void KSViewStyle::drawCentered(QPainter* painter, const QRect& rect, const QString& path) const
 {
     const QPixmap pixmap = picture(path);
-    if (pixmap.isNull()) {
+    if (pixmap.isNull())
         return;
-    }
     QSize size = pixmap.size();
-    if (size.width() > rect.width() || size.height() > rect.height()) {
+    if (size.width() > rect.width() || size.height() > rect.height())
         size.scale(rect.size(), Qt::KeepAspectRatio);
-    }
     painter->drawPixmap(QRect(rect.left() + (rect.width() - size.width()) / 2,
                               rect.top() + (rect.height() - size.height()) / 2, size.width(), size.height()),
                         pixmap);
@@ -97,19 +95,17 @@ void KSViewStyle::drawPrimitive(PrimitiveElement element, const QStyleOption* op
 {
     switch (element) {
     case PE_IndicatorHeaderArrow:
-        if (const auto* header = qstyleoption_cast<const QStyleOptionHeader*>(option)) {
+        if (const auto* header = qstyleoption_cast<const QStyleOptionHeader*>(option))
             drawHeaderArrow(painter, *header);
-        }
         break;
     case PE_IndicatorBranch:
         if (option->state & State_Children) {
             const bool enabled = option->state & State_Enabled;
             const bool pressed = option->state & State_Sunken;
-            if (option->state & State_Open) {
+            if (option->state & State_Open)
                 drawCollapseIndicator(painter, option->rect, enabled, pressed);
-            } else {
+            else
                 drawExpandIndicator(painter, option->rect, enabled, pressed);
-            }
         }
         break;
     case PE_PanelItemViewRow: // the view draws the row's background over its full width
@@ -124,23 +120,20 @@ void KSViewStyle::drawPrimitive(PrimitiveElement element, const QStyleOption* op
 void KSViewStyle::drawHeaderSection(QPainter* painter, const QStyleOptionHeader& option) const
 {
     painter->drawPixmap(option.rect, picture(QStringLiteral(":/Views/Header_Main_1")));
-    if (option.state & State_Sunken) {
+    if (option.state & State_Sunken)
         painter->fillRect(option.rect, PRESSED_HEADER);
-    }
     const bool last =
         option.position == QStyleOptionHeader::End || option.position == QStyleOptionHeader::OnlyOneSection;
-    if (!last) {
+    if (!last)
         drawVerticalSeparator(painter, option.rect);
-    }
 }
 
 void KSViewStyle::drawHeaderLabel(QPainter* painter, const QStyleOptionHeader& option) const
 {
     const int spacing = length(KSVIEW::DesignItemSpacing);
     QRect rect = option.rect.adjusted(spacing, 0, -spacing, 0);
-    if (option.sortIndicator != QStyleOptionHeader::None) {
+    if (option.sortIndicator != QStyleOptionHeader::None)
         rect.adjust(0, 0, -HEADER_ARROW_SIZE - spacing, 0);
-    }
     QFont font = painter->font();
     font.setPixelSize(length(KSVIEW::DesignFontSize));
     painter->save();
@@ -153,9 +146,8 @@ void KSViewStyle::drawHeaderLabel(QPainter* painter, const QStyleOptionHeader& o
 
 void KSViewStyle::drawHeaderArrow(QPainter* painter, const QStyleOptionHeader& option) const
 {
-    if (option.sortIndicator == QStyleOptionHeader::None) {
+    if (option.sortIndicator == QStyleOptionHeader::None)
         return;
-    }
     // Qt's "down" is the ascending order, for which the arrow points up here.
     const bool ascending = option.sortIndicator == QStyleOptionHeader::SortDown;
     QRect rect = option.rect;
@@ -223,33 +215,29 @@ void KSViewStyle::drawViewItem(QPainter* painter, const QStyleOptionViewItem& op
             painter->restore();
         }
     }
-    if (!layout.mark.isNull()) {
+    if (!layout.mark.isNull())
         drawCentered(painter, layout.mark, QStringLiteral(":/Views/Recording_Icon"));
-    }
     drawViewItemText(painter, option, layout.text);
 }
 
 QFont KSViewStyle::itemFont(const QStyleOptionViewItem& option) const
 {
     QFont font = option.font;
-    if (!option.index.data(Qt::FontRole).isValid()) {
+    if (!option.index.data(Qt::FontRole).isValid())
         font.setPixelSize(length(KSVIEW::DesignFontSize));
-    }
     return font;
 }
 
 void KSViewStyle::drawViewItemText(QPainter* painter, const QStyleOptionViewItem& option,
                                    const QRect& rect) const
 {
-    if (option.text.isEmpty() || rect.width() <= 0) {
+    if (option.text.isEmpty() || rect.width() <= 0)
         return;
-    }
     int role = KSVIEW::DesignTextColor;
-    if (!(option.state & State_Enabled)) {
+    if (!(option.state & State_Enabled))
         role = KSVIEW::DesignDisabledTextColor;
-    } else if (option.state & State_Selected) {
+    else if (option.state & State_Selected)
         role = KSVIEW::DesignSelectedTextColor;
-    }
     const QFont font = itemFont(option);
     painter->save();
     painter->setFont(font);
@@ -285,12 +273,10 @@ KSViewStyle::FirstColumnLayout KSViewStyle::layoutFirstColumn(const QRect& cell,
         left += size + spacing;
         return square;
     };
-    if (hasCheckBox) {
+    if (hasCheckBox)
         layout.checkBox = place(length(KSVIEW::DesignCheckBoxSize));
-    }
-    if (hasIcon) {
+    if (hasIcon)
         layout.icon = place(length(KSVIEW::DesignIconSize));
-    }
     int right = cell.right() - spacing;
     if (hasMark) {
         const int size = length(KSVIEW::DesignIconSize);

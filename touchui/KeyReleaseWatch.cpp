@@ -5,15 +5,12 @@
 
 void KeyReleaseWatch::watch(QWidget* widget)
 {
-    if (m_widget == widget) {
+    if (m_widget == widget)
         return;
-    }
-    if (m_widget != nullptr) {
+    if (m_widget != nullptr)
         m_widget->removeEventFilter(this);
-    }
-    if (widget != nullptr) {
+    if (widget != nullptr)
         widget->installEventFilter(this);
-    }
     m_widget = widget;
 }
 

@@ -27,9 +27,8 @@ SubCommonDefine::tagSoftKeyBoardInitData LineEditField::describe() const
     SubCommonDefine::tagSoftKeyBoardInitData data;
     data.fieldKind = FIELD_KIND;
     FieldName::readShort(m_edit.objectName(), data);
-    if (m_edit.maxLength() < UNLIMITED_LENGTH) {
+    if (m_edit.maxLength() < UNLIMITED_LENGTH)
         data.maxLength = m_edit.maxLength();
-    }
     data.text = m_edit.text().toStdWString();
     data.textLength = static_cast<int>(m_edit.text().size());
     data.selectionStart = m_edit.selectionStart();
@@ -48,9 +47,8 @@ void LineEditField::enter(const QString& text)
 
 bool LineEditField::judge(const QString& text)
 {
-    if (m_edit.validator() == nullptr) {
+    if (m_edit.validator() == nullptr)
         return false;
-    }
     QLineEdit scratch;
     scratch.setValidator(m_edit.validator());
     scratch.insert(text);

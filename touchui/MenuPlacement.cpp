@@ -44,9 +44,8 @@ int menuTop(int flags, int anchorY, int menuHeight, const QRect& bounds)
         top = anchorY;
     } else if (flags & Above) {
         int bottom = anchorY + ABOVE_OVERLAP;
-        if (bottomEdge(bounds) - bottom < LEAST_BOTTOM_SPACE) {
+        if (bottomEdge(bounds) - bottom < LEAST_BOTTOM_SPACE)
             bottom = bottomEdge(bounds) - BOTTOM_SPACE;
-        }
         top = bottom - menuHeight;
     } else {
         top = anchorY - GAP - menuHeight;
@@ -120,9 +119,8 @@ QRect background(const QSize& size, ArrowSide side)
 
 QRect rowRect(const QRect& background, int border, int count, int index)
 {
-    if (index < 0 || index >= count) {
+    if (index < 0 || index >= count)
         return QRect();
-    }
     const QRect inner = background.adjusted(border, border, -border, -border);
     const int height = inner.height() / count;
     const int rest = index == count - 1 ? inner.height() - height * count : 0;
@@ -131,11 +129,9 @@ QRect rowRect(const QRect& background, int border, int count, int index)
 
 int rowAt(const QRect& background, int border, int count, const QPoint& point)
 {
-    for (int i = 0; i < count; ++i) {
-        if (rowRect(background, border, count, i).contains(point)) {
+    for (int i = 0; i < count; ++i)
+        if (rowRect(background, border, count, i).contains(point))
             return i;
-        }
-    }
     return -1;
 }
 

@@ -19,9 +19,8 @@ OneFinger::OneFinger(QWidget* widget) : m_widget(widget)
 
 OneFinger::Step OneFinger::follow(const QTouchEvent* event, QObject* receiver)
 {
-    if (receiver == nullptr) {
+    if (receiver == nullptr)
         receiver = event->target() != nullptr ? event->target() : m_widget;
-    }
     const Step step = stepOf(event, receiver);
     m_step = step;
     report(step);
@@ -54,9 +53,8 @@ void OneFinger::report(Step step)
 
 bool OneFinger::takes(QEvent* event, QObject* receiver)
 {
-    if (!isTouch(event)) {
+    if (!isTouch(event))
         return false;
-    }
     follow(static_cast<QTouchEvent*>(event), receiver);
     return true;
 }
@@ -83,46 +81,38 @@ QMouseEvent OneFinger::mouseEvent(QEvent::Type type, const QPointF& position, co
 
 OneFinger::Step OneFinger::stepOf(const QTouchEvent* event, QObject* receiver)
 {
-    if (event->type() == QEvent::TouchBegin) {
+    if (event->type() == QEvent::TouchBegin)
         return begin(event, receiver);
-    }
-    if (!isDown()) {
+    if (!isDown())
         return Step::None;
-    }
     if (event->type() == QEvent::TouchCancel) {
         drop();
         return Step::None;
     }
-    if (m_receiver != receiver) {
+    if (m_receiver != receiver)
         return Step::None;
-    }
     for (const QEventPoint& point : event->points()) {
-        if (point.id() != m_id) {
+        if (point.id() != m_id)
             continue;
-        }
         m_position = point.globalPosition();
         // If another finger is still on the same object, the lift is reported by a TouchUpdate.
-        if (event->type() == QEvent::TouchUpdate && point.state() != QEventPoint::State::Released) {
+        if (event->type() == QEvent::TouchUpdate && point.state() != QEventPoint::State::Released)
             return Step::Move;
-        }
         letGo();
         return Step::End;
     }
-    if (event->type() == QEvent::TouchEnd) {
+    if (event->type() == QEvent::TouchEnd)
         drop(); // all fingers are up, but the lift of this one was not reported
-    }
     return Step::None;
 }
 
 OneFinger::Step OneFinger::begin(const QTouchEvent* event, QObject* receiver)
 {
-    if (event->points().isEmpty() || !m_widget->isEnabled()) {
+    if (event->points().isEmpty() || !m_widget->isEnabled())
         return Step::None;
-    }
     if (isDown()) {
-        if (!isLost(receiver)) {
+        if (!isLost(receiver))
             return Step::None;
-        }
         drop();
     }
     reportEnd();
@@ -131,9 +121,8 @@ OneFinger::Step OneFinger::begin(const QTouchEvent* event, QObject* receiver)
     m_receiver = receiver;
     m_position = point.globalPosition();
     m_pressPosition = m_position;
-    if (receiver != m_widget) {
+    if (receiver != m_widget)
         connect(receiver, &QObject::destroyed, this, &OneFinger::receiverDestroyed, Qt::UniqueConnection);
-    }
     return Step::Begin;
 }
 
@@ -142,9 +131,8 @@ OneFinger::Step OneFinger::begin(const QTouchEvent* event, QObject* receiver)
 // long as the first object still has its touch.
 bool OneFinger::isLost(const QObject* receiver) const
 {
-    if (receiver == m_receiver) {
+    if (receiver == m_receiver)
         return true;
-    }
     KSAppEventFilter* gate = KSAppEventFilter::current();
     return gate != nullptr && !gate->isTouched(m_receiver);
 }
@@ -154,9 +142,8 @@ void OneFinger::cancel()
     if (isDown()) {
         const QPointer<OneFinger> self = this;
         cancelTouchOf(m_receiver); // normally arrives here as a TouchCancel, unless it is filtered
-        if (self == nullptr || !isDown()) {
+        if (self == nullptr || !isDown())
             return;
-        }
     } else if (!m_hold.isActive()) {
         return;
     }
@@ -182,9 +169,8 @@ void OneFinger::startHold(int milliseconds)
 
 void OneFinger::letGo()
 {
-    if (m_receiver != nullptr && m_receiver != m_widget) {
+    if (m_receiver != nullptr && m_receiver != m_widget)
         disconnect(m_receiver, &QObject::destroyed, this, &OneFinger::receiverDestroyed);
-    }
     m_id = NONE;
     m_receiver.clear();
     m_hold.stop();
@@ -208,16 +194,14 @@ void OneFinger::receiverDestroyed(QObject* receiver)
 
 void OneFinger::reportEnd()
 {
-    if (std::exchange(m_isEndUnreported, false)) {
+    if (std::exchange(m_isEndUnreported, false))
         Q_EMIT cancelled();
-    }
 }
 
 bool OneFinger::eventFilter(QObject* object, QEvent* event)
 {
-    if (object == m_widget && (event->type() == QEvent::Hide ||
-                               (event->type() == QEvent::EnabledChange && !m_widget->isEnabled()))) {
+    if (object == m_widget &&
+        (event->type() == QEvent::Hide || (event->type() == QEvent::EnabledChange && !m_widget->isEnabled())))
         cancel();
-    }
     return QObject::eventFilter(object, event);
 }

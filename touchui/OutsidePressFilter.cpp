@@ -14,30 +14,26 @@ OutsidePressFilter::OutsidePressFilter(QWidget* window, QObject* parent) : QObje
 
 void OutsidePressFilter::registerWithGate()
 {
-    if (m_gate != nullptr) {
+    if (m_gate != nullptr)
         return;
-    }
     m_gate = KSAppEventFilter::current();
-    if (m_gate != nullptr) {
+    if (m_gate != nullptr)
         m_gate->registerEventFilter(this);
-    }
 }
 
 void OutsidePressFilter::start()
 {
     m_watching = true;
     registerWithGate();
-    if (m_gate == nullptr) {
+    if (m_gate == nullptr)
         QCoreApplication::instance()->installEventFilter(this);
-    }
 }
 
 void OutsidePressFilter::stop()
 {
     m_watching = false;
-    if (m_swallowsTouch || m_swallowsMouse) {
+    if (m_swallowsTouch || m_swallowsMouse)
         return;
-    }
     QCoreApplication::instance()->removeEventFilter(this); // installed only if there is no KSAppEventFilter
 }
 
@@ -53,16 +49,14 @@ bool OutsidePressFilter::eventFilter(QObject* obj, QEvent* event)
     case QEvent::TouchUpdate:
         return m_swallowsTouch && obj == m_swallowed;
     case QEvent::MouseButtonRelease:
-        if (!m_swallowsMouse || obj != m_swallowed) {
+        if (!m_swallowsMouse || obj != m_swallowed)
             return false;
-        }
         endSwallowing();
         return true;
     case QEvent::TouchEnd:
     case QEvent::TouchCancel:
-        if (!m_swallowsTouch || obj != m_swallowed) {
+        if (!m_swallowsTouch || obj != m_swallowed)
             return false;
-        }
         endSwallowing();
         return true;
     default:
@@ -72,12 +66,10 @@ bool OutsidePressFilter::eventFilter(QObject* obj, QEvent* event)
 
 bool OutsidePressFilter::swallowPress(QObject* obj, QEvent* event)
 {
-    if (m_swallowsTouch || m_swallowsMouse) {
+    if (m_swallowsTouch || m_swallowsMouse)
         endSwallowing(); // the lift of the previous press was not seen
-    }
-    if (!m_watching || !isOutside(event)) {
+    if (!m_watching || !isOutside(event))
         return false;
-    }
     const bool touch = event->type() == QEvent::TouchBegin;
     m_swallowsTouch = touch;
     m_swallowsMouse = !touch;
@@ -89,15 +81,13 @@ bool OutsidePressFilter::swallowPress(QObject* obj, QEvent* event)
 
 bool OutsidePressFilter::isOutside(QEvent* event) const
 {
-    if (m_window == nullptr) {
+    if (m_window == nullptr)
         return false;
-    }
     QPointF position;
     if (event->type() == QEvent::TouchBegin) {
         const auto* touch = static_cast<QTouchEvent*>(event);
-        if (touch->points().isEmpty()) {
+        if (touch->points().isEmpty())
             return false;
-        }
         position = touch->points().constFirst().globalPosition();
     } else {
         position = static_cast<QMouseEvent*>(event)->globalPosition();
@@ -110,7 +100,6 @@ void OutsidePressFilter::endSwallowing()
     m_swallowsTouch = false;
     m_swallowsMouse = false;
     m_swallowed.clear();
-    if (!m_watching) {
+    if (!m_watching)
         stop();
-    }
 }

@@ -79,10 +79,9 @@ ScrollViewerRow* ScrollViewerBoard::row(int index) const
 QList<KSBaseItemWidget*> ScrollViewerBoard::widgets() const
 {
     QList<KSBaseItemWidget*> result;
-    for (const Row& row : m_rows) {
+    for (const Row& row : m_rows)
         if (row.widget)
             result.append(row.widget);
-    }
     return result;
 }
 

@@ -6,9 +6,8 @@ using SubCommonDefine::tagSoftKeyBoardKeyData;
 
 std::optional<tagSoftKeyBoardKeyData> ServiceKey::ofPress(const QEvent* event)
 {
-    if (event->type() != QEvent::KeyPress) {
+    if (event->type() != QEvent::KeyPress)
         return std::nullopt;
-    }
     const auto* key = static_cast<const QKeyEvent*>(event);
     tagSoftKeyBoardKeyData data;
     data.eventType = key->type();
@@ -34,9 +33,8 @@ QKeyEvent ServiceKey::toEvent(const tagSoftKeyBoardKeyData& data)
 
 bool ServiceKey::isSpecial(const QEvent* event)
 {
-    if (event->type() != QEvent::KeyPress && event->type() != QEvent::KeyRelease) {
+    if (event->type() != QEvent::KeyPress && event->type() != QEvent::KeyRelease)
         return false;
-    }
     const int key = static_cast<const QKeyEvent*>(event)->key();
     switch (key) {
     case Qt::Key_Tab:

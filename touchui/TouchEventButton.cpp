@@ -31,19 +31,16 @@ bool TouchEventButton::event(QEvent* event)
 {
     switch (event->type()) {
     case QEvent::TouchBegin:
-        if (isEnabled()) {
+        if (isEnabled())
             touchBeginEvent(static_cast<QTouchEvent*>(event));
-        }
         return true;
     case QEvent::TouchUpdate:
-        if (isEnabled()) {
+        if (isEnabled())
             touchUpdateEvent(static_cast<QTouchEvent*>(event));
-        }
         return true;
     case QEvent::TouchEnd:
-        if (isEnabled()) {
+        if (isEnabled())
             touchEndEvent(static_cast<QTouchEvent*>(event));
-        }
         return true;
     case QEvent::TouchCancel:
         m_finger.follow(static_cast<QTouchEvent*>(event));
@@ -55,14 +52,12 @@ bool TouchEventButton::event(QEvent* event)
 
 bool TouchEventButton::touchBeginEvent(QTouchEvent* event)
 {
-    if (event->points().isEmpty()) {
+    if (event->points().isEmpty())
         return true;
-    }
     const QPointF start = event->points().constFirst().globalPressPosition();
     Q_EMIT signalPressedPoint(QPoint(static_cast<int>(start.x()), static_cast<int>(start.y())));
-    if (m_finger.follow(event, this) != OneFinger::Step::Begin) {
+    if (m_finger.follow(event, this) != OneFinger::Step::Begin)
         return true;
-    }
     m_lastPosition = m_finger.positionIn(this).toPoint();
     QMouseEvent press(QEvent::MouseButtonPress, m_lastPosition, m_finger.position().toPoint(), Qt::LeftButton,
                       Qt::LeftButton, Qt::NoModifier);
@@ -122,20 +117,17 @@ void TouchEventButton::sendRelease(const QPoint& position, const QPoint& screenP
 // unlike x.
 void TouchEventButton::moveIntoWidget(QPoint& position, QPoint& screenPosition) const
 {
-    if (m_touchRect.isNull() || !m_touchRect.contains(position)) {
+    if (m_touchRect.isNull() || !m_touchRect.contains(position))
         return;
-    }
     QPoint inside = position;
-    if (inside.x() < 0) {
+    if (inside.x() < 0)
         inside.setX(0);
-    } else if (inside.x() > width() - 1) {
+    else if (inside.x() > width() - 1)
         inside.setX(width() - 1);
-    }
-    if (inside.y() <= 0) {
+    if (inside.y() <= 0)
         inside.setY(1);
-    } else if (inside.y() > height() - 1) {
+    else if (inside.y() > height() - 1)
         inside.setY(height() - 1);
-    }
     screenPosition += inside - position;
     position = inside;
 }
@@ -153,8 +145,7 @@ void TouchEventButton::mouseMoveEvent(QMouseEvent* event)
 
 void TouchEventButton::slotEmitReleased()
 {
-    if (m_releasedOutside) {
+    if (m_releasedOutside)
         LOG_USER_OPERATE(L"TEB slotEmitReleased", 239, L"Outside!");
-    }
     Q_EMIT signalReleased(m_releasedOutside);
 }

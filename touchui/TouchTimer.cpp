@@ -11,9 +11,8 @@ public:
     int start(QObject* receiver, int milliseconds) override { return receiver->startTimer(milliseconds); }
     void stop(QObject* receiver, int id) override
     {
-        if (id > 0) {
+        if (id > 0)
             receiver->killTimer(id);
-        }
     }
 };
 
@@ -50,26 +49,22 @@ void TouchTimer::start(int milliseconds)
 
 void TouchTimer::stop()
 {
-    if (m_id != 0) {
+    if (m_id != 0)
         currentClock().stop(this, m_id);
-    }
     m_id = 0;
 }
 
 void TouchTimer::restartIfActive()
 {
-    if (isActive()) {
+    if (isActive())
         start(m_interval);
-    }
 }
 
 void TouchTimer::timerEvent(QTimerEvent* event)
 {
-    if (event->timerId() != m_id) {
+    if (event->timerId() != m_id)
         return;
-    }
-    if (m_singleShot) {
+    if (m_singleShot)
         stop();
-    }
     Q_EMIT timeout();
 }

@@ -15,9 +15,8 @@ void TreeCheckStates::toggle(const QModelIndex& index)
 // Children that do not exist yet take the state of their parent when they are created.
 void TreeCheckStates::setChildren(const QModelIndex& index, Qt::CheckState state)
 {
-    if (!m_model.areChildrenMade(index)) {
+    if (!m_model.areChildrenMade(index))
         return;
-    }
     const int rows = m_model.rowCount(index);
     int number = 0;
     for (int row = 0; row < rows; ++row) {
@@ -46,9 +45,8 @@ void TreeCheckStates::updateParents(const QModelIndex& index)
 
 void TreeCheckStates::setByNumber(const QModelIndex& index, int number)
 {
-    if (!m_model.getCheckable(index)) {
+    if (!m_model.getCheckable(index))
         return;
-    }
     int checkable = 0;
     bool partial = false;
     for (int row = 0; row < m_model.rowCount(index); ++row) {
@@ -57,10 +55,9 @@ void TreeCheckStates::setByNumber(const QModelIndex& index, int number)
         partial = partial || child.data(Qt::CheckStateRole).toInt() == Qt::PartiallyChecked;
     }
     Qt::CheckState state = Qt::PartiallyChecked;
-    if (number <= 0) {
+    if (number <= 0)
         state = Qt::Unchecked;
-    } else if (number >= checkable && !partial) {
+    else if (number >= checkable && !partial)
         state = Qt::Checked;
-    }
     m_model.setData(index, static_cast<int>(state), Qt::CheckStateRole);
 }

@@ -25,16 +25,14 @@ QString TreeLoadingMarks::imagePath(int step)
 
 void TreeLoadingMarks::start()
 {
-    if (m_model != nullptr && !m_timer.isActive()) {
+    if (m_model != nullptr && !m_timer.isActive())
         m_timer.start();
-    }
 }
 
 void TreeLoadingMarks::restartIfActive()
 {
-    if (m_timer.isActive()) {
+    if (m_timer.isActive())
         m_timer.start();
-    }
 }
 
 void TreeLoadingMarks::turn()

@@ -12,9 +12,8 @@ namespace
 unsigned long putTagged(unsigned char* p, unsigned char tag, std::uint64_t value, int bytes)
 {
     *p++ = tag;
-    for (int shift = (bytes - 1) * 8; shift >= 0; shift -= 8) {
+    for (int shift = (bytes - 1) * 8; shift >= 0; shift -= 8)
         *p++ = static_cast<unsigned char>(value >> shift);
-    }
     return 1UL + static_cast<unsigned long>(bytes);
 }
 
@@ -94,32 +93,25 @@ unsigned long CPack::pack_int64(unsigned char* p, std::int64_t value)
 
 unsigned long CPack::pack_uint(unsigned char* p, unsigned int value)
 {
-    if (value < 0x80) {
+    if (value < 0x80)
         return pack_fixuint(p, static_cast<std::uint8_t>(value));
-    }
-    if (value < 0x100) {
+    if (value < 0x100)
         return pack_uint8(p, static_cast<std::uint8_t>(value));
-    }
-    if (value < 0x10000) {
+    if (value < 0x10000)
         return pack_uint16(p, static_cast<std::uint16_t>(value));
-    }
     return pack_uint32(p, value);
 }
 
 unsigned long CPack::pack_int(unsigned char* p, int value)
 {
-    if (value >= 0) {
+    if (value >= 0)
         return pack_uint(p, static_cast<unsigned int>(value));
-    }
-    if (value >= -32) {
+    if (value >= -32)
         return pack_fixint(p, static_cast<std::int8_t>(value));
-    }
-    if (value >= INT8_MIN) {
+    if (value >= INT8_MIN)
         return pack_int8(p, static_cast<std::int8_t>(value));
-    }
-    if (value >= INT16_MIN) {
+    if (value >= INT16_MIN)
         return pack_int16(p, static_cast<std::int16_t>(value));
-    }
     return pack_int32(p, value);
 }
 
@@ -129,18 +121,16 @@ unsigned long CPack::pack_raw_header(unsigned char* p, std::uint32_t length)
         *p = static_cast<unsigned char>(PackTag::FIRST_FIX_RAW | length);
         return 1;
     }
-    if (length < 0x10000) {
+    if (length < 0x10000)
         return putTagged(p, PackTag::RAW16, length, 2);
-    }
     return putTagged(p, PackTag::RAW32, length, 4);
 }
 
 unsigned long CPack::pack_raw(unsigned char* p, const void* data, std::uint32_t length)
 {
     const unsigned long header = pack_raw_header(p, length);
-    if (length > 0) {
+    if (length > 0)
         std::memcpy(p + header, data, length);
-    }
     return header + length;
 }
 

@@ -120,9 +120,8 @@ bool CPack_Simplebuffer::pack_simplebuffer_raw(simplebuffer* buffer, const void*
     unsigned char header[CPack::MAX_SCALAR_SIZE];
     const unsigned long headerSize = CPack::pack_raw_header(header, length);
     unsigned char* place = CSimpleBuffer::simplebuffer_checksize(buffer, headerSize + length);
-    if (place == nullptr) {
+    if (place == nullptr)
         return false;
-    }
     CPack::pack_raw(place, data, length);
     return true;
 }

@@ -36,25 +36,20 @@ void CSimpleBuffer::simplebuffer_init(simplebuffer* buffer, unsigned char* data,
 
 unsigned char* CSimpleBuffer::simplebuffer_checksize(simplebuffer* buffer, unsigned long n)
 {
-    if (n > ULONG_MAX - buffer->size) {
+    if (n > ULONG_MAX - buffer->size)
         return nullptr;
-    }
     const unsigned long end = buffer->size + n;
     if (end > buffer->capacity) {
         const unsigned long spare = std::max(n, s_minimum_allocate_unit);
-        if (spare > ULONG_MAX - end) {
+        if (spare > ULONG_MAX - end)
             return nullptr;
-        }
         auto* storage = static_cast<unsigned char*>(s_allocate_function(end + spare));
-        if (storage == nullptr) {
+        if (storage == nullptr)
             return nullptr;
-        }
-        if (buffer->size != 0) {
+        if (buffer->size != 0)
             std::memcpy(storage, buffer->data, buffer->size);
-        }
-        if (buffer->capacity != 0) {
+        if (buffer->capacity != 0)
             s_free_function(buffer->data);
-        }
         buffer->data = storage;
         buffer->capacity = end + spare;
     }
@@ -65,13 +60,11 @@ unsigned char* CSimpleBuffer::simplebuffer_checksize(simplebuffer* buffer, unsig
 
 bool CSimpleBuffer::simplebuffer_write(simplebuffer* buffer, const unsigned char* data, unsigned long n)
 {
-    if (n == 0) {
+    if (n == 0)
         return true;
-    }
     unsigned char* place = simplebuffer_checksize(buffer, n);
-    if (place == nullptr) {
+    if (place == nullptr)
         return false;
-    }
     std::memcpy(place, data, n);
     return true;
 }
@@ -85,8 +78,7 @@ unsigned char* CSimpleBuffer::simplebuffer_release(simplebuffer* buffer)
 
 void CSimpleBuffer::simplebuffer_destroy(simplebuffer* buffer)
 {
-    if (buffer->capacity != 0) {
+    if (buffer->capacity != 0)
         s_free_function(buffer->data);
-    }
     *buffer = simplebuffer();
 }

@@ -56,26 +56,21 @@ unsigned long CUnpack::unpack_base(unsigned char* p)
 
 unsigned long CUnpack::unpack_base(unsigned char* p, unsigned long available)
 {
-    if (p == nullptr || available == 0) {
+    if (p == nullptr || available == 0)
         return 0;
-    }
     const unsigned char tag = *p;
     const int bytes = numberSize(tag);
-    if (bytes < 0 || static_cast<unsigned long>(bytes) > available - 1) {
+    if (bytes < 0 || static_cast<unsigned long>(bytes) > available - 1)
         return 0;
-    }
     std::uint64_t number = 0;
-    for (int i = 1; i <= bytes; ++i) {
+    for (int i = 1; i <= bytes; ++i)
         number = number << 8 | p[i];
-    }
     const unsigned long header = 1UL + static_cast<unsigned long>(bytes);
     if (isRaw(tag)) {
-        if (bytes == 0) {
+        if (bytes == 0)
             number = tag & PackTag::MAX_FIX_RAW;
-        }
-        if (number > available - header) {
+        if (number > available - header)
             return 0;
-        }
     }
     m_tag = tag;
     m_number = number;
@@ -92,9 +87,8 @@ unsigned long CUnpack::unpack(unpack_info_t* info, unsigned char* p, unsigned lo
 {
     CUnpack reader;
     const unsigned long header = reader.unpack_base(p, available);
-    if (header == 0) {
+    if (header == 0)
         return 0;
-    }
     reader.translate(info);
     return isRaw(reader.m_tag) ? header + reader.m_number : header;
 }
@@ -146,9 +140,8 @@ void CUnpack::translate(unpack_info_t* info) const
         info->value.i64 = static_cast<std::int8_t>(m_tag);
     } else {
         info->type = UNPACK_UNSIGNED;
-        if (m_tag <= PackTag::LAST_POSITIVE_FIX) {
+        if (m_tag <= PackTag::LAST_POSITIVE_FIX)
             info->value.u64 = m_tag;
-        }
     }
 }
 

@@ -97,9 +97,8 @@ void ClientSocket::waitUntilConnected(int milliseconds) const
 ClientSocket::Outcome ClientSocket::finishConnect()
 {
     pollfd state{m_socket, POLLOUT, 0};
-    if (poll(&state, 1, 0) <= 0) {
+    if (poll(&state, 1, 0) <= 0)
         return Outcome::Pending;
-    }
     int error = 0;
     socklen_t size = sizeof error;
     if (getsockopt(m_socket, SOL_SOCKET, SO_ERROR, &error, &size) != 0 || error != 0 ||
@@ -123,20 +122,18 @@ ClientSocket::Outcome ClientSocket::writeFrame(const char* bytes, long used, lon
         const long fromBytes = std::max(used - sent, 0L);
         std::array<iovec, 2> parts = {part(bytes + sent, fromBytes),
                                       part(ZEROS.data(), SocketFrame::FRAME_SIZE - sent - fromBytes)};
-        if (fromBytes == 0) {
+        if (fromBytes == 0)
             parts[0] = part(bytes, 0);
-        }
         msghdr message{};
         message.msg_iov = parts.data();
         message.msg_iovlen = parts.size();
         const ssize_t count = sendmsg(m_socket, &message, MSG_NOSIGNAL | MSG_DONTWAIT);
-        if (count > 0) {
+        if (count > 0)
             sent += count;
-        } else if (count == -1 && (errno == EAGAIN || errno == EWOULDBLOCK)) {
+        else if (count == -1 && (errno == EAGAIN || errno == EWOULDBLOCK))
             return Outcome::Pending;
-        } else if (count == 0 || errno != EINTR) {
+        else if (count == 0 || errno != EINTR)
             return Outcome::Failed;
-        }
     }
     return Outcome::Done;
 }
@@ -153,24 +150,19 @@ bool ClientSocket::waitForRoom()
     while (true) {
         pollfd state{m_socket, POLLIN | POLLOUT, 0};
         const int ready = poll(&state, 1, -1);
-        if (ready == -1 && errno != EINTR) {
+        if (ready == -1 && errno != EINTR)
             return false;
-        }
-        if (ready <= 0) {
+        if (ready <= 0)
             continue;
-        }
         if ((state.revents & POLLIN) != 0) {
             std::array<char, 512> scratch;
-            if (recv(m_socket, scratch.data(), scratch.size(), MSG_DONTWAIT) == 0) {
+            if (recv(m_socket, scratch.data(), scratch.size(), MSG_DONTWAIT) == 0)
                 return false; // the peer has closed
-            }
         }
-        if ((state.revents & (POLLERR | POLLHUP)) != 0) {
+        if ((state.revents & (POLLERR | POLLHUP)) != 0)
             return false;
-        }
-        if ((state.revents & POLLOUT) != 0) {
+        if ((state.revents & POLLOUT) != 0)
             return true;
-        }
     }
 }
 
@@ -182,9 +174,8 @@ long ClientSocket::undelivered() const
 
 void ClientSocket::interrupt()
 {
-    if (m_socket != -1) {
+    if (m_socket != -1)
         shutdown(m_socket, SHUT_RDWR);
-    }
 }
 
 void ClientSocket::close()

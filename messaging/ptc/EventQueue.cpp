@@ -7,9 +7,8 @@ namespace PTC
 
 EventQueue::~EventQueue()
 {
-    for (Event* event : m_events) {
+    for (Event* event : m_events)
         delete event;
-    }
 }
 
 void EventQueue::add(Event* event)
@@ -24,9 +23,8 @@ Event* EventQueue::at(unsigned long index) const
 
 void EventQueue::remove(unsigned long index)
 {
-    if (index >= m_events.size()) {
+    if (index >= m_events.size())
         return;
-    }
     delete m_events[index];
     m_events.erase(m_events.begin() + static_cast<std::ptrdiff_t>(index));
 }

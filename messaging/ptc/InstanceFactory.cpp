@@ -21,9 +21,8 @@ InstanceFactory::~InstanceFactory()
     // Stop the receiving threads before anything that their calls may use is destroyed.
     m_remoteReceiver.reset();
     const auto deadline = std::chrono::steady_clock::now() + FINISH_TIME;
-    for (const auto& [key, sender] : m_senders) {
+    for (const auto& [key, sender] : m_senders)
         sender->finish(deadline);
-    }
 }
 
 bool InstanceFactory::initialize()

@@ -20,12 +20,10 @@ void QtReceiver::recv(Event* event)
     auto posted = std::make_unique<QtReceiverEvent>(event);
     {
         std::unique_lock<std::mutex> lock(m_mutex);
-        if (QThread::currentThread() != thread()) {
+        if (QThread::currentThread() != thread())
             m_roomForMore.wait(lock, [this] { return m_stopped || m_pendingEvents < MAX_PENDING_EVENTS; });
-        }
-        if (m_stopped) {
+        if (m_stopped)
             return;
-        }
         ++m_pendingEvents;
     }
     QCoreApplication::postEvent(this, posted.release());
@@ -46,9 +44,8 @@ int QtReceiver::pendingEvents()
 
 void QtReceiver::customEvent(QEvent* event)
 {
-    if (event->type() != static_cast<QEvent::Type>(QtReceiverEvent::TYPE)) {
+    if (event->type() != static_cast<QEvent::Type>(QtReceiverEvent::TYPE))
         return;
-    }
     oneEventLess();
     const std::unique_ptr<Event> call(static_cast<QtReceiverEvent*>(event)->takeEvent());
     if (call != nullptr) {

@@ -37,11 +37,10 @@ void Receiver::addCBAdapter(IAdapterBase* adapter)
 void Receiver::enter(AdapterMap& adapters, IAdapterBase* adapter)
 {
     std::unique_ptr<IAdapterBase>& entry = adapters[adapter->getId()];
-    if (entry == nullptr) {
+    if (entry == nullptr)
         entry.reset(adapter);
-    } else if (entry.get() != adapter) {
+    else if (entry.get() != adapter)
         m_lostAdapters.emplace_back(adapter);
-    }
 }
 
 void Receiver::removeCBAdapter(long id)
@@ -53,9 +52,8 @@ void Receiver::handleEvent(Event* event)
 {
     AdapterMap& adapters = event->isCallback() ? m_callbackAdapters : m_adapters;
     const auto found = adapters.find(event->getObjectId());
-    if (found != adapters.end()) {
+    if (found != adapters.end())
         found->second->receive(event);
-    }
 }
 
 } // namespace PTC

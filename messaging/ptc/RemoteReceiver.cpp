@@ -33,9 +33,8 @@ void RemoteReceiver::addReceiver(IReceiver* receiver)
 {
     const std::lock_guard<std::mutex> lock(m_mutex);
     std::unique_ptr<IReceiver>& entry = m_receivers[receiver->getId()];
-    if (entry.get() != receiver) {
+    if (entry.get() != receiver)
         entry.reset(receiver);
-    }
 }
 
 void RemoteReceiver::handleEventPacket(EventPacket* packet)
@@ -54,9 +53,8 @@ void RemoteReceiver::handleEventPacket(EventPacket* packet)
 void RemoteReceiver::stopReceivers()
 {
     const std::lock_guard<std::mutex> lock(m_mutex);
-    for (const auto& [id, receiver] : m_receivers) {
+    for (const auto& [id, receiver] : m_receivers)
         receiver->stopReceiving();
-    }
 }
 
 IReceiver* RemoteReceiver::findReceiver(long id)

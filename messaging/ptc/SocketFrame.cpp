@@ -8,9 +8,8 @@ namespace SocketFrame
 unsigned short portOf(long identity)
 {
     const long offset = k2sys_port_offset();
-    if (identity < 1 || identity > 65535 || identity + offset < 1 || identity + offset > 65535) {
+    if (identity < 1 || identity > 65535 || identity + offset < 1 || identity + offset > 65535)
         return 0;
-    }
     return static_cast<unsigned short>(identity + offset);
 }
 

@@ -44,41 +44,33 @@ SocketRemoteReceiver::~SocketRemoteReceiver()
     m_stopping = true;
     stopReceivers();
     const int listenSocket = m_listenSocket.exchange(-1);
-    if (listenSocket != -1) {
+    if (listenSocket != -1)
         shutdown(listenSocket, SHUT_RDWR); // wakes up accept
-    }
     if (m_acceptThread != nullptr) {
         m_acceptThread->interrupt();
         m_acceptThread->join();
     }
     {
         const std::lock_guard<std::mutex> lock(m_connectionMutex);
-        for (const Connection& connection : m_connections) {
-            if (!connection.ended) {
+        for (const Connection& connection : m_connections)
+            if (!connection.ended)
                 shutdown(connection.socket, SHUT_RDWR);
-            }
-        }
     }
-    for (const Connection& connection : m_connections) {
+    for (const Connection& connection : m_connections)
         connection.thread->join();
-    }
-    for (const int socket : m_endedSockets) {
+    for (const int socket : m_endedSockets)
         close(socket);
-    }
-    if (listenSocket != -1) {
+    if (listenSocket != -1)
         close(listenSocket);
-    }
 }
 
 bool SocketRemoteReceiver::initialize(long identity)
 {
-    if (m_listenSocket != -1) {
+    if (m_listenSocket != -1)
         return false;
-    }
     PTC::RemoteReceiver::initialize(identity);
-    if (!prepareListeningSocket()) {
+    if (!prepareListeningSocket())
         return false;
-    }
     try {
         m_acceptThread = std::make_unique<boost::thread>(&SocketRemoteReceiver::connectListeners, this);
     } catch (const boost::thread_resource_error&) {
@@ -95,24 +87,20 @@ bool SocketRemoteReceiver::prepareListeningSocket()
         return false;
     }
     const int on = 1;
-    if (setsockopt(m_listenSocket, SOL_SOCKET, SO_REUSEADDR, &on, sizeof on) != 0) {
+    if (setsockopt(m_listenSocket, SOL_SOCKET, SO_REUSEADDR, &on, sizeof on) != 0)
         return failStart("[Error]Socket Server reuse address failed!");
-    }
     const int bufferSize = SocketFrame::RECEIVE_BUFFER_SIZE;
-    if (setsockopt(m_listenSocket, SOL_SOCKET, SO_RCVBUF, &bufferSize, sizeof bufferSize) != 0) {
+    if (setsockopt(m_listenSocket, SOL_SOCKET, SO_RCVBUF, &bufferSize, sizeof bufferSize) != 0)
         return failStart("[Error]Socket Server set Rec buffer failed!");
-    }
     sockaddr_in address{};
     address.sin_family = AF_INET;
     address.sin_addr.s_addr = htonl(INADDR_LOOPBACK);
     address.sin_port = htons(SocketFrame::portOf(getIdentity()));
     if (address.sin_port == 0 ||
-        ::bind(m_listenSocket, reinterpret_cast<sockaddr*>(&address), sizeof address) != 0) {
+        ::bind(m_listenSocket, reinterpret_cast<sockaddr*>(&address), sizeof address) != 0)
         return failStart("[Error]Socket Server create failed!");
-    }
-    if (listen(m_listenSocket, LISTEN_BACKLOG) != 0) {
+    if (listen(m_listenSocket, LISTEN_BACKLOG) != 0)
         return failStart("[Error]create socket server listenner failed!");
-    }
     return true;
 }
 
@@ -147,9 +135,8 @@ void SocketRemoteReceiver::waitClientLink()
         }
         const int client = accept4(listenSocket, nullptr, nullptr, SOCK_CLOEXEC);
         if (m_stopping) {
-            if (client != -1) {
+            if (client != -1)
                 close(client);
-            }
             return;
         }
         if (client == -1) {
@@ -200,9 +187,8 @@ void SocketRemoteReceiver::joinEndedThreads()
     const boost::this_thread::disable_interruption toTheEnd;
     const std::lock_guard<std::mutex> lock(m_connectionMutex);
     std::erase_if(m_connections, [](const Connection& connection) {
-        if (connection.ended) {
+        if (connection.ended)
             connection.thread->join();
-        }
         return connection.ended;
     });
 }
@@ -230,20 +216,17 @@ void SocketRemoteReceiver::keepEndedSocket(Connection& connection)
 int SocketRemoteReceiver::ThreadMain(int socket)
 {
     const std::unique_ptr<char[]> buffer(new (std::nothrow) char[SocketFrame::FRAME_SIZE]());
-    if (buffer == nullptr) {
+    if (buffer == nullptr)
         return -1;
-    }
     long got = 0;
     long want = SocketFrame::FRAME_SIZE;
     while (true) {
         const int received =
             static_cast<int>(recv(socket, buffer.get() + got, static_cast<std::size_t>(want), 0));
-        if (received == -1 && errno == EINTR) {
+        if (received == -1 && errno == EINTR)
             continue;
-        }
-        if (isRecvDataFailed(received)) {
+        if (isRecvDataFailed(received))
             return 0;
-        }
         if (!sendACK(socket)) {
             want = SocketFrame::FRAME_SIZE - got; // the next read overwrites these bytes
             continue;
@@ -268,9 +251,8 @@ void SocketRemoteReceiver::executePacket(char* frame)
     packet.callback = frame[SocketFrame::IS_CALLBACK] != 0;
     packet.size = readLong(frame, SocketFrame::SIZE);
     packet.remote = frame[SocketFrame::IS_REMOTE] != 0;
-    if (packet.size <= 0 || packet.size > SocketFrame::MAX_PAYLOAD) {
+    if (packet.size <= 0 || packet.size > SocketFrame::MAX_PAYLOAD)
         return;
-    }
     const auto size = static_cast<std::size_t>(packet.size);
     char* data = new char[size];
     std::memcpy(data, frame + SocketFrame::HEADER_SIZE, size);

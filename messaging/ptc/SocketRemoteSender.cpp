@@ -82,39 +82,34 @@ bool SocketRemoteSender::beginConnect(long identity)
         m_socket.close();
         PTC::RemoteSender::initialize(identity);
     }
-    if (m_isWorking) {
+    if (m_isWorking)
         return true;
-    }
     Outcome outcome = ensureConnection();
     if (outcome == Outcome::Pending) {
         m_socket.waitUntilConnected(REFUSAL_MS);
         outcome = m_socket.finishConnect();
     }
-    if (outcome == Outcome::Pending) {
+    if (outcome == Outcome::Pending)
         startWork();
-    }
     return outcome != Outcome::Failed;
 }
 
 // Returns Done if the connection is established, otherwise the result of beginning a new one.
 Outcome SocketRemoteSender::ensureConnection()
 {
-    if (m_socket.isOpen() && !m_socket.peerHasClosed()) {
+    if (m_socket.isOpen() && !m_socket.peerHasClosed())
         return Outcome::Done;
-    }
     return m_socket.beginConnect(port());
 }
 
 void SocketRemoteSender::send(PTC::Event* event)
 {
     const std::unique_ptr<PTC::Event> owner(event);
-    if (event == nullptr || event->getSize() < 0 || event->getSize() > SocketFrame::MAX_PAYLOAD) {
+    if (event == nullptr || event->getSize() < 0 || event->getSize() > SocketFrame::MAX_PAYLOAD)
         return;
-    }
     Lock lock(m_mutex);
-    if (m_isFinished || getIdentity() == -1) {
+    if (m_isFinished || getIdentity() == -1)
         return;
-    }
     const long used = packFrame(*event);
     long sent = 0;
     switch (m_isWorking ? Outcome::Pending : sendAtOnce(used, sent)) {
@@ -156,14 +151,12 @@ Outcome SocketRemoteSender::sendAtOnce(long used, long& sent)
 {
     for (int connection = 0; connection < 2; ++connection) {
         const Outcome connected = ensureConnection();
-        if (connected != Outcome::Done) {
+        if (connected != Outcome::Done)
             return connected;
-        }
         m_socket.takeAcknowledgements(DRAIN_SIZE);
         const Outcome outcome = m_socket.writeFrame(m_frame.data(), used, sent);
-        if (outcome != Outcome::Failed) {
+        if (outcome != Outcome::Failed)
             return outcome;
-        }
         m_socket.close();
         sent = 0;
     }
@@ -188,9 +181,8 @@ void SocketRemoteSender::keep(Lock& lock, long used, long sent)
 // Logs once that calls are lost. The lock is released meanwhile.
 void SocketRemoteSender::lose(Lock& lock, Loss loss)
 {
-    if (m_isLosing) {
+    if (m_isLosing)
         return;
-    }
     m_isLosing = true;
     const std::wstring peer = L"port " + std::to_wstring(port());
     lock.unlock();
@@ -203,9 +195,8 @@ void SocketRemoteSender::lose(Lock& lock, Loss loss)
 void SocketRemoteSender::loseWaiting(Lock& lock)
 {
     m_socket.close();
-    if (m_waiting.empty()) {
+    if (m_waiting.empty())
         return;
-    }
     m_waiting.clear();
     m_firstSent = 0;
     lose(lock, Loss::NotReached);
@@ -220,16 +211,13 @@ bool SocketRemoteSender::isConnected() const
 bool SocketRemoteSender::reconnect()
 {
     Lock lock(m_mutex);
-    if (m_isWorking) {
+    if (m_isWorking)
         return m_socket.isOpen();
-    }
-    if (getIdentity() == -1 || m_isFinished) {
+    if (getIdentity() == -1 || m_isFinished)
         return false;
-    }
     const Outcome outcome = ensureConnection();
-    if (outcome == Outcome::Pending) {
+    if (outcome == Outcome::Pending)
         startWork();
-    }
     return outcome == Outcome::Done;
 }
 
@@ -237,12 +225,10 @@ bool SocketRemoteSender::reconnect()
 
 void SocketRemoteSender::startWork()
 {
-    if (m_isWorking) {
+    if (m_isWorking)
         return;
-    }
-    if (m_worker.joinable()) {
+    if (m_worker.joinable())
         m_worker.join(); // it no longer takes the lock
-    }
     try {
         m_worker = std::thread(&SocketRemoteSender::work, this);
         m_isWorking = true;
@@ -262,22 +248,19 @@ void SocketRemoteSender::stopWork(Lock& lock)
         m_isAbandoned = false;
         m_socket.close();
     }
-    if (m_worker.joinable()) {
+    if (m_worker.joinable())
         m_worker.join();
-    }
 }
 
 void SocketRemoteSender::work()
 {
     WorkerSignals::leaveToMainThread();
     Lock lock(m_mutex);
-    while (!m_isAbandoned && (m_socket.isConnecting() || !m_waiting.empty())) {
-        if (m_socket.isConnecting()) {
+    while (!m_isAbandoned && (m_socket.isConnecting() || !m_waiting.empty()))
+        if (m_socket.isConnecting())
             completeConnection(lock);
-        } else {
+        else
             sendNextWaiting(lock);
-        }
-    }
     m_isWorking = false;
     m_workEnded.notify_all();
 }
@@ -288,9 +271,8 @@ void SocketRemoteSender::completeConnection(Lock& lock)
     lock.unlock();
     m_socket.waitUntilConnected(timeout);
     lock.lock();
-    if (m_isAbandoned || m_socket.finishConnect() == Outcome::Done) {
+    if (m_isAbandoned || m_socket.finishConnect() == Outcome::Done)
         return;
-    }
     loseWaiting(lock);
 }
 
@@ -300,9 +282,8 @@ void SocketRemoteSender::sendNextWaiting(Lock& lock)
         // Only one new connection per frame, so that a peer that closes every connection is not retried for
         // ever.
         m_firstSent = 0;
-        if (std::exchange(m_firstWasBegunAnew, true) || m_socket.beginConnect(port()) == Outcome::Failed) {
+        if (std::exchange(m_firstWasBegunAnew, true) || m_socket.beginConnect(port()) == Outcome::Failed)
             loseWaiting(lock);
-        }
         return;
     }
     const std::vector<char>& frame = m_waiting.front();
@@ -311,17 +292,15 @@ void SocketRemoteSender::sendNextWaiting(Lock& lock)
         m_waiting.pop_front();
         m_firstSent = 0;
         m_firstWasBegunAnew = false;
-        if (m_waiting.empty()) {
+        if (m_waiting.empty())
             m_isLosing = false;
-        }
         break;
     case Outcome::Pending: {
         lock.unlock();
         const bool hasRoom = m_socket.waitForRoom();
         lock.lock();
-        if (!hasRoom) {
+        if (!hasRoom)
             m_socket.close();
-        }
         break;
     }
     case Outcome::Failed:
@@ -333,14 +312,12 @@ void SocketRemoteSender::sendNextWaiting(Lock& lock)
 void SocketRemoteSender::finish(std::chrono::steady_clock::time_point deadline)
 {
     Lock lock(m_mutex);
-    if (m_isFinished) {
+    if (m_isFinished)
         return;
-    }
     m_isFinished = true;
     m_workEnded.wait_until(lock, deadline, [this] { return !m_isWorking; });
-    if (!m_isWorking) {
+    if (!m_isWorking)
         waitUntilDelivered(deadline);
-    }
     stopWork(lock);
     m_socket.close();
 }

@@ -82,15 +82,13 @@ struct Several {
     static constexpr const char* KIND = Form::KIND;
     static void pack(simplebuffer* to, const Type& values)
     {
-        for (const auto& value : values) {
+        for (const auto& value : values)
             Form::pack(to, value);
-        }
     }
     static void unpack(RecordReader& from, Type& values)
     {
-        for (auto& value : values) {
+        for (auto& value : values)
             Form::unpack(from, value);
-        }
     }
 };
 using ThreeWide = Several<Wide, 3>;

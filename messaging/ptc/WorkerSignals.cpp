@@ -12,9 +12,8 @@ void leaveToMainThread()
 {
     sigset_t signals;
     sigfillset(&signals);
-    for (const int fault : {SIGSEGV, SIGBUS, SIGFPE, SIGILL, SIGABRT}) {
+    for (const int fault : {SIGSEGV, SIGBUS, SIGFPE, SIGILL, SIGABRT})
         sigdelset(&signals, fault);
-    }
     pthread_sigmask(SIG_BLOCK, &signals, nullptr);
 }
 

@@ -16,14 +16,12 @@ public:
     // Does nothing if no target is set.
     void receive(PTC::Event* event) override
     {
-        if (m_target == nullptr) {
+        if (m_target == nullptr)
             return;
-        }
         const long received = event->getMethodId();
         Interface::forEachMethod([&](long id, const char*, auto method, const char*) {
-            if (id == received) {
+            if (id == received)
                 ServiceCall::deliver(*event, *m_target, method);
-            }
         });
     }
 

@@ -8,11 +8,10 @@
 
 void TitlerAdapter::receive(PTC::Event* event)
 {
-    if (target() != nullptr && event->getMethodId() == METHOD_registerCallBack) {
+    if (target() != nullptr && event->getMethodId() == METHOD_registerCallBack)
         receiveRegisterCallBack(event);
-    } else {
+    else
         TargetAdapter::receive(event);
-    }
 }
 
 // A call from within this process carries the plain id instead of a packed record, in memory that is freed
@@ -24,9 +23,8 @@ void TitlerAdapter::receiveRegisterCallBack(PTC::Event* event)
         RecordPacking::deserialize(info, event->getData(), event->getSize());
     } else {
         int id = 0;
-        if (event->getData() != nullptr && event->getSize() >= static_cast<long>(sizeof id)) {
+        if (event->getData() != nullptr && event->getSize() >= static_cast<long>(sizeof id))
             std::memcpy(&id, event->getData(), sizeof id);
-        }
         delete[] static_cast<char*>(event->getData());
         event->setData(nullptr);
         info.adapterId = id;
@@ -35,9 +33,8 @@ void TitlerAdapter::receiveRegisterCallBack(PTC::Event* event)
     std::unique_ptr<PTC::IProxyBase> proxy(
         createProxy(CALLBACK_INTERFACE_ID, info.adapterId, info.receiverIdentity));
     auto* callBack = dynamic_cast<ITitlerCallBack*>(proxy.get());
-    if (callBack == nullptr) {
-        return; // the previous registration stays in effect
-    }
+    if (callBack == nullptr)
+        return;                         // the previous registration stays in effect
     static_cast<void>(proxy.release()); // the target owns it now
     target()->registerCallBack(callBack);
 }

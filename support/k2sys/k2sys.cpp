@@ -34,9 +34,8 @@ std::string& logTag()
 
 int writePath(const std::string& path, char* buffer, size_t size, int state)
 {
-    if (buffer == nullptr || size == 0) {
+    if (buffer == nullptr || size == 0)
         return -1;
-    }
     if (path.size() >= size) {
         buffer[0] = '\0';
         return -1;
@@ -54,24 +53,21 @@ std::string environment(const char* name)
 std::string homeFolder()
 {
     const std::string home = environment("HOME");
-    if (!home.empty()) {
+    if (!home.empty())
         return home;
-    }
     char storage[4096];
     passwd entry{};
     passwd* found = nullptr;
-    if (getpwuid_r(getuid(), &entry, storage, sizeof storage, &found) == 0 && found != nullptr) {
+    if (getpwuid_r(getuid(), &entry, storage, sizeof storage, &found) == 0 && found != nullptr)
         return found->pw_dir;
-    }
     return "/";
 }
 
 std::string parentOf(const std::string& path)
 {
     const auto slash = path.rfind('/');
-    if (slash == std::string::npos || slash == 0) {
+    if (slash == std::string::npos || slash == 0)
         return "/";
-    }
     return path.substr(0, slash);
 }
 
@@ -79,9 +75,8 @@ std::string programPrefix()
 {
     char path[PATH_MAX];
     const ssize_t length = readlink("/proc/self/exe", path, sizeof path - 1);
-    if (length <= 0) {
+    if (length <= 0)
         return "/usr";
-    }
     path[length] = '\0';
     return parentOf(parentOf(path));
 }
@@ -97,23 +92,19 @@ std::string zoneNameOfFile(const std::string& path)
 std::string zoneName()
 {
     std::string zone = environment("TZ");
-    if (!zone.empty() && zone.front() == ':') {
+    if (!zone.empty() && zone.front() == ':')
         zone.erase(0, 1);
-    }
-    if (!zone.empty() && zone.front() == '/') {
+    if (!zone.empty() && zone.front() == '/')
         zone = zoneNameOfFile(zone);
-    }
-    if (zone.find('/') != std::string::npos) {
+    if (zone.find('/') != std::string::npos)
         return zone;
-    }
     char target[PATH_MAX];
     const ssize_t length = readlink("/etc/localtime", target, sizeof target - 1);
     if (length > 0) {
         target[length] = '\0';
         zone = zoneNameOfFile(target);
-        if (!zone.empty()) {
+        if (!zone.empty())
             return zone;
-        }
     }
     std::ifstream file("/etc/timezone");
     zone.clear();
@@ -194,9 +185,8 @@ int k2sys_getenv_ac_prefix(char* buffer, size_t size)
 int k2sys_get_time(struct tm* now)
 {
     const time_t seconds = time(nullptr);
-    if (now == nullptr || localtime_r(&seconds, now) == nullptr) {
+    if (now == nullptr || localtime_r(&seconds, now) == nullptr)
         return -1;
-    }
     return 1;
 }
 
@@ -204,9 +194,8 @@ long long k2sys_fs_size(const char* path)
 {
     struct statvfs status {
     };
-    if (path == nullptr || statvfs(path, &status) != 0) {
+    if (path == nullptr || statvfs(path, &status) != 0)
         return -1;
-    }
     return static_cast<long long>(status.f_blocks) * static_cast<long long>(status.f_frsize);
 }
 
@@ -217,15 +206,13 @@ long long k2sys_fs_remain(const char* path)
         char* end = nullptr;
         errno = 0;
         const long long remain = std::strtoll(fixed.c_str(), &end, 10);
-        if (errno == 0 && *end == '\0' && remain >= 0) {
+        if (errno == 0 && *end == '\0' && remain >= 0)
             return remain;
-        }
     }
     struct statvfs status {
     };
-    if (path == nullptr || statvfs(path, &status) != 0) {
+    if (path == nullptr || statvfs(path, &status) != 0)
         return -1;
-    }
     return static_cast<long long>(status.f_bavail) * static_cast<long long>(status.f_frsize);
 }
 
@@ -233,9 +220,8 @@ int k2sys_get_current_timezone(char* buffer, size_t size)
 {
     const std::string zone = zoneName();
     if (zone.empty()) {
-        if (buffer != nullptr && size > 0) {
+        if (buffer != nullptr && size > 0)
             buffer[0] = '\0';
-        }
         return 0;
     }
     return writePath(zone, buffer, size, 1) == 1 ? 1 : 0;

@@ -45,10 +45,9 @@ public:
     {
         const std::lock_guard lock(mMutex);
         QList<long> methods;
-        for (const SiblingCall& call : mCalls) {
+        for (const SiblingCall& call : mCalls)
             if (call.service == service)
                 methods << call.method;
-        }
         return methods;
     }
 
@@ -58,10 +57,9 @@ public:
     QByteArray lastArguments(long service, long method) const
     {
         const std::lock_guard lock(mMutex);
-        for (auto call = mCalls.crbegin(); call != mCalls.crend(); ++call) {
+        for (auto call = mCalls.crbegin(); call != mCalls.crend(); ++call)
             if (call->service == service && call->method == method)
                 return call->data;
-        }
         return {};
     }
 
@@ -70,10 +68,9 @@ public:
     {
         const std::lock_guard lock(mMutex);
         QList<QByteArray> arguments;
-        for (const SiblingCall& call : mCalls) {
+        for (const SiblingCall& call : mCalls)
             if (call.service == service && call.method == method)
                 arguments << call.data;
-        }
         return arguments;
     }
 

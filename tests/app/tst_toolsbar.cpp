@@ -164,9 +164,8 @@ void tst_toolsbar::tapsGiveTheirSignal()
                            &ToolsBar::redoButtonClicked, &ToolsBar::SafeAreaButtonClicked,
                            &ToolsBar::closeButtonClick};
     std::vector<std::unique_ptr<QSignalSpy>> spies;
-    for (const Signal signal : list) {
+    for (const Signal signal : list)
         spies.push_back(std::make_unique<QSignalSpy>(m_bar, signal));
-    }
     m_stack->push(new CountingCommand(&m_value));
     m_stack->push(new CountingCommand(&m_value));
     m_stack->undo();
@@ -472,9 +471,8 @@ void tst_toolsbar::textsAreTranslated()
     m_bar->translateText();
     QCOMPARE(label("Text")->text(), QStringLiteral("新建文本"));
     QCOMPARE(menu()->actions().at(2)->text(), QStringLiteral("棋盘格"));
-    for (const char* name : {"Folder", "Text", "Delete", "Undo", "Redo", "SafeArea", "Canvas", "Close"}) {
+    for (const char* name : {"Folder", "Text", "Delete", "Undo", "Redo", "SafeArea", "Canvas", "Close"})
         QVERIFY(label(name)->text().at(0).unicode() > 0x2e80);
-    }
     QCOMPARE(QCoreApplication::translate("CanvasScene", "Title goes here"), QStringLiteral("在此输入标题"));
     QCOMPARE(QCoreApplication::translate("TitlerWindow", "Done"), QStringLiteral("完成"));
     QCoreApplication::removeTranslator(&translator);
@@ -492,9 +490,8 @@ int main(int argc, char** argv)
     QFile file(path);
     if (!file.open(QIODevice::WriteOnly) ||
         file.write(R"({"screens":[{"name":"desk","x":0,"y":0,"width":1920,"height":1080,)"
-                   R"("logicalDpi":96,"logicalBaseDpi":96,"dpr":1}]})") < 0) {
+                   R"("logicalDpi":96,"logicalBaseDpi":96,"dpr":1}]})") < 0)
         return 1;
-    }
     file.close();
     qputenv("QT_QPA_PLATFORM", "offscreen:configfile=" + path.toLocal8Bit());
     QApplication app(argc, argv);

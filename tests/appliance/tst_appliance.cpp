@@ -212,9 +212,8 @@ QJsonObject tst_appliance::event(const QString& kind)
     while (!deadline.hasExpired()) {
         while (m_appliance->canReadLine()) {
             const QJsonObject json = QJsonDocument::fromJson(m_appliance->readLine()).object();
-            if (json["event"] == kind) {
+            if (json["event"] == kind)
                 return json;
-            }
         }
         QCoreApplication::processEvents(QEventLoop::AllEvents, 10);
         m_appliance->waitForReadyRead(10);

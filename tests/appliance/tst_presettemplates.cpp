@@ -66,13 +66,11 @@ QRect changedRect(const QImage& one, const QImage& other)
     for (int y = 0; y < one.height(); ++y) {
         const QRgb* first = reinterpret_cast<const QRgb*>(one.constScanLine(y));
         const QRgb* second = reinterpret_cast<const QRgb*>(other.constScanLine(y));
-        for (int x = 0; x < one.width(); ++x) {
+        for (int x = 0; x < one.width(); ++x)
             if (qAbs(qRed(first[x]) - qRed(second[x])) + qAbs(qGreen(first[x]) - qGreen(second[x])) +
                     qAbs(qBlue(first[x]) - qBlue(second[x])) >=
-                CLEARLY) {
+                CLEARLY)
                 rect |= QRect(x, y, 1, 1);
-            }
-        }
     }
     return rect;
 }
@@ -136,9 +134,8 @@ QImage tst_presettemplates::pictureOf(const SampleTitles::Sample& sample, std::s
     title.setText({std::make_unique<TText>(*sample.archive.text().at(text)).release()});
     ThumbnailRender render;
     render.makeThumbnail(&title, true);
-    if (!QTest::qWaitFor([&render] { return render.makePictureThreadIsFinished(); }, PATIENCE_MS)) {
+    if (!QTest::qWaitFor([&render] { return render.makePictureThreadIsFinished(); }, PATIENCE_MS))
         return {};
-    }
     const QString folder = mDir.path() + QLatin1Char('/');
     return QImage(folder + QString::fromStdString(title.getThumbnailBig()));
 }
@@ -146,9 +143,8 @@ QImage tst_presettemplates::pictureOf(const SampleTitles::Sample& sample, std::s
 void tst_presettemplates::initTestCase()
 {
     QVERIFY(mDir.isValid());
-    for (const char* family : {"KST", "DFHeiW5-A"}) {
+    for (const char* family : {"KST", "DFHeiW5-A"})
         QVERIFY2(QFontDatabase::families().contains(QLatin1String(family)), family);
-    }
 }
 
 void tst_presettemplates::bothSetsHaveTheSameDesigns()
@@ -168,9 +164,8 @@ void tst_presettemplates::bothSetsHaveTheSameDesigns()
         }
     }
     QCOMPARE(names.size(), qsizetype(english.size()));
-    for (const char* name : {"LowerThird", "Strap", "FullScreen", "Quote", "NamePlate", "CornerMark"}) {
+    for (const char* name : {"LowerThird", "Strap", "FullScreen", "Quote", "NamePlate", "CornerMark"})
         QVERIFY2(names.contains(QLatin1String(name)), name);
-    }
 }
 
 void tst_presettemplates::stylesAreOfThePanel()
@@ -220,11 +215,9 @@ void tst_presettemplates::backgroundsHaveAlphaAtBothSizes()
         over(Qt::gray, big).scaled(CANVAS, Qt::IgnoreAspectRatio, Qt::SmoothTransformation);
     const QImage painted = over(Qt::gray, small);
     qint64 sum = 0;
-    for (int y = 0; y < CANVAS.height(); ++y) {
-        for (int x = 0; x < CANVAS.width(); ++x) {
+    for (int y = 0; y < CANVAS.height(); ++y)
+        for (int x = 0; x < CANVAS.width(); ++x)
             sum += qAbs(qGray(reduced.pixel(x, y)) - qGray(painted.pixel(x, y)));
-        }
-    }
     QVERIFY2(sum < qint64(CANVAS.width()) * CANVAS.height(), qPrintable(QString::number(sum)));
 }
 
@@ -267,9 +260,8 @@ void tst_presettemplates::textIsSafeAndLegible()
         const QRect place = changedRect(over(ground, picture), over(ground, emptyPicture()));
         QVERIFY(!place.isEmpty());
         QVERIFY2(TITLE_SAFE.contains(place), text.getText().c_str());
-        for (const QRect& other : places) {
+        for (const QRect& other : places)
             QVERIFY2(!other.intersects(place), text.getText().c_str());
-        }
         places.append(place);
         if (!sample.background) {
             // Nothing is behind the letters: an outline of the other shade sets them off.
@@ -282,11 +274,9 @@ void tst_presettemplates::textIsSafeAndLegible()
         for (const QColor& video : {QColor(Qt::white), QColor(Qt::black)}) {
             const QImage behind = over(video, background);
             double least = 21;
-            for (int y = place.top(); y <= place.bottom(); y += 3) {
-                for (int x = place.left(); x <= place.right(); x += 3) {
+            for (int y = place.top(); y <= place.bottom(); y += 3)
+                for (int x = place.left(); x <= place.right(); x += 3)
                     least = qMin(least, contrast(ink, behind.pixelColor(x, y)));
-                }
-            }
             QVERIFY2(
                 least >= CONTRAST,
                 qPrintable(QStringLiteral("%1: %2").arg(QString::fromStdString(text.getText())).arg(least)));

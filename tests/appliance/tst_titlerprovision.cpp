@@ -39,9 +39,8 @@ QMap<QString, QByteArray> tree(const QString& root)
 std::vector<std::unique_ptr<Archive>> titlesOf(const QString& folder)
 {
     std::vector<std::unique_ptr<Archive>> titles;
-    for (Archive* archive : TitleParser().getFilsByOrderInFolder(folder.toStdString())) {
+    for (Archive* archive : TitleParser().getFilsByOrderInFolder(folder.toStdString()))
         titles.emplace_back(archive);
-    }
     return titles;
 }
 
@@ -53,16 +52,14 @@ double meanDifference(const QByteArray& one, const QByteArray& two)
 {
     const QImage first = QImage::fromData(one).convertToFormat(QImage::Format_RGBA8888);
     const QImage second = QImage::fromData(two).convertToFormat(QImage::Format_RGBA8888);
-    if (first.isNull() || first.size() != second.size()) {
+    if (first.isNull() || first.size() != second.size())
         return -1;
-    }
     qint64 sum = 0;
     for (int y = 0; y < first.height(); ++y) {
         const uchar* a = first.constScanLine(y);
         const uchar* b = second.constScanLine(y);
-        for (int x = 0; x < 4 * first.width(); ++x) {
+        for (int x = 0; x < 4 * first.width(); ++x)
             sum += qAbs(int(a[x]) - int(b[x]));
-        }
     }
     return double(sum) / (4.0 * first.width() * first.height());
 }
@@ -106,9 +103,8 @@ void tst_titlerprovision::initTestCase()
     QCOMPARE(mBase, mDir.path() + "/defaultuser/");
     TitlerProvision provision(mBase);
     QVERIFY2(provision.writeMissing(), qPrintable(provision.error()));
-    for (const QString& path : tree(mBase).keys()) {
+    for (const QString& path : tree(mBase).keys())
         QVERIFY2(!path.contains(".making"), qPrintable(path));
-    }
 }
 
 void tst_titlerprovision::thePathFileHasEveryNode()

@@ -233,10 +233,9 @@ void tst_canvasscene::newObjectsCascade()
     QCOMPARE(second->getItemTText()->getZValue(), 2.0F);
     // The lines of the safe area lie above all texts.
     const auto items = canvas.scene->items();
-    for (QGraphicsItem* item : items) {
+    for (QGraphicsItem* item : items)
         if (item->type() == QGraphicsRectItem::Type)
             QCOMPARE(item->zValue(), 6.0);
-    }
 }
 
 void tst_canvasscene::lowestIdIsReused()
@@ -324,10 +323,9 @@ void tst_canvasscene::chinaModel()
     Canvas canvas;
     canvas.scene->setModuleInfo(SystemSetupDef::emInformationModelChina);
     QVERIFY(InputLanguageFonts::IS_CN_MODULE);
-    for (const auto& row : InputLanguageFonts::LAST_KEEPED_FONT) {
+    for (const auto& row : InputLanguageFonts::LAST_KEEPED_FONT)
         for (const QString& family : row)
             QCOMPARE(family, QStringLiteral("DFHeiW5-A"));
-    }
     canvas.open({});
     canvas.scene->slotInsertNewTextItem();
     QCOMPARE(canvas.text(1)->getLastAlpaTextStyleValue()->textItems()[0]->getFontFamily(),

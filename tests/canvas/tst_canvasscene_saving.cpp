@@ -82,10 +82,9 @@ QStringList tst_canvasscene_saving::textsInFile(const Canvas& canvas)
         return {QStringLiteral("no file")};
     QStringList texts;
     QXmlStreamReader reader(&file);
-    while (!reader.atEnd()) {
+    while (!reader.atEnd())
         if (reader.readNext() == QXmlStreamReader::StartElement && reader.name() == QLatin1String("content"))
             texts.append(reader.attributes().value(QLatin1String("text")).toString());
-    }
     return reader.hasError() ? QStringList{reader.errorString()} : texts;
 }
 

@@ -53,10 +53,9 @@ private Q_SLOTS:
         qputenv("K2SYS_AC_ROOT", "");
         QVERIFY(QDir(mFolder->path()).mkpath("defaultuser/resources/Templates"));
         mChecker = QImage(240, 135, QImage::Format_RGB32);
-        for (int y = 0; y < 135; ++y) {
+        for (int y = 0; y < 135; ++y)
             for (int x = 0; x < 240; ++x)
                 mChecker.setPixel(x, y, (x / 8 + y / 8) % 2 ? 0xFF808080u : 0xFFC0C0C0u);
-        }
         QVERIFY(mChecker.save(checkerPath()));
     }
 
@@ -70,9 +69,8 @@ private Q_SLOTS:
               std::pair("alpha", QImage::Format_ARGB32), std::pair("opaque", QImage::Format_RGB32),
               std::pair("palette", QImage::Format_Indexed8), std::pair("mono", QImage::Format_Mono),
               std::pair("grey", QImage::Format_Grayscale8), std::pair("16 bits", QImage::Format_RGBA64),
-              std::pair("24 bits", QImage::Format_RGB888)}) {
+              std::pair("24 bits", QImage::Format_RGB888)})
             QTest::newRow(name) << pattern(61, 37, format);
-        }
         QTest::newRow("one pixel") << pattern(1, 1, QImage::Format_ARGB32);
         QTest::newRow("large") << pattern(1920, 1080, QImage::Format_ARGB32_Premultiplied);
         QImage marked = pattern(9, 9, QImage::Format_ARGB32);
@@ -154,10 +152,9 @@ private Q_SLOTS:
         const QImage source = pattern(960, 540, QImage::Format_ARGB32);
         QVERIFY(resize(source));
         QImage reduced(240, 135, QImage::Format_ARGB32);
-        for (int y = 0; y < 135; ++y) {
+        for (int y = 0; y < 135; ++y)
             for (int x = 0; x < 240; ++x)
                 reduced.setPixel(x, y, meanOfTwoLines(source, {x, y}));
-        }
         QCOMPARE(read("black.png"), reduced.convertToFormat(QImage::Format_RGB32));
         QImage expected = mChecker;
         QPainter(&expected).drawImage(0, 0, reduced);
@@ -338,10 +335,9 @@ private:
         if (!file.open(QIODevice::ReadOnly))
             return -1;
         const QList<QByteArray> lines = file.readAll().split('\n');
-        for (const QByteArray& line : lines) {
+        for (const QByteArray& line : lines)
             if (line.startsWith("VmPeak:"))
                 return line.mid(7).trimmed().split(' ').constFirst().toLongLong();
-        }
         return -1;
     }
 

@@ -115,10 +115,9 @@ QByteArray tiff(bool isBig, const QList<TiffField>& fields)
 QImage gradient(QImage::Format format)
 {
     QImage image(61, 37, QImage::Format_ARGB32);
-    for (int y = 0; y < image.height(); ++y) {
+    for (int y = 0; y < image.height(); ++y)
         for (int x = 0; x < image.width(); ++x)
             image.setPixel(x, y, qRgba(4 * x, 6 * y, 100, 255 - x));
-    }
     return image.convertToFormat(format);
 }
 

@@ -92,18 +92,16 @@ QJsonObject boxWhere(const QImage& image, const std::function<bool(int, int)>& c
 std::optional<QJsonObject> sizeOf(const QStringList& arguments)
 {
     const auto image = load(arguments.at(0));
-    if (!image) {
+    if (!image)
         return std::nullopt;
-    }
     return QJsonObject{{"width", image->width()}, {"height", image->height()}};
 }
 
 std::optional<QJsonObject> alphaOf(const QStringList& arguments)
 {
     const auto image = load(arguments.at(0));
-    if (!image) {
+    if (!image)
         return std::nullopt;
-    }
     return boxWhere(*image, [&image](int x, int y) { return qAlpha(image->pixel(x, y)) > 0; });
 }
 
@@ -111,9 +109,8 @@ std::optional<QJsonObject> changedBetween(const QStringList& arguments)
 {
     const auto before = load(arguments.at(0));
     const auto after = load(arguments.at(1));
-    if (!before || !after || before->size() != after->size()) {
+    if (!before || !after || before->size() != after->size())
         return std::nullopt;
-    }
     return boxWhere(*after, [&](int x, int y) {
         const QRgb a = before->pixel(x, y);
         const QRgb b = after->pixel(x, y);
@@ -133,9 +130,8 @@ QJsonObject compare(const QImage& shown, const QImage& wanted, const QString& sh
     qint64 sum = 0;
     for (int y = 0; y < size.height(); ++y) {
         for (int x = 0; x < size.width(); ++x) {
-            if (skip(x, y)) {
+            if (skip(x, y))
                 continue;
-            }
             const int level = std::max(distanceToNeighbourhood(wanted.pixel(x, y), shown, x, y),
                                        distanceToNeighbourhood(shown.pixel(x, y), wanted, x, y));
             ++histogram.at(static_cast<std::size_t>(level));
@@ -174,9 +170,8 @@ std::optional<QJsonObject> compareWithScreen(const QStringList& arguments)
     const QRect rect(arguments.at(1).toInt(), arguments.at(2).toInt(), arguments.at(3).toInt(),
                      arguments.at(4).toInt());
     const auto title = load(arguments.at(5));
-    if (!screen || !title || !screen->rect().contains(rect)) {
+    if (!screen || !title || !screen->rect().contains(rect))
         return std::nullopt;
-    }
     const QImage shown = screen->copy(rect);
     // Where the title is transparent, the screen shows what lies under the canvas; it is not compared.
     const QImage wanted = title->scaled(rect.size(), Qt::IgnoreAspectRatio, Qt::SmoothTransformation)
@@ -198,9 +193,8 @@ std::optional<QJsonObject> comparePictures(const QStringList& arguments)
 {
     const auto one = load(arguments.at(0));
     const auto other = load(arguments.at(1));
-    if (!one || !other || one->size() != other->size()) {
+    if (!one || !other || one->size() != other->size())
         return std::nullopt;
-    }
     return compare(onGrey(*one), onGrey(*other), arguments.at(2), [&](int x, int y) {
         return qAlpha(one->pixel(x, y)) == 0 && qAlpha(other->pixel(x, y)) == 0;
     });
@@ -214,17 +208,16 @@ int main(int argc, char* argv[])
     QStringList arguments = QCoreApplication::arguments().mid(1);
     const QString command = arguments.isEmpty() ? QString() : arguments.takeFirst();
     std::optional<QJsonObject> answer;
-    if (command == QLatin1String("size") && arguments.size() == 1) {
+    if (command == QLatin1String("size") && arguments.size() == 1)
         answer = sizeOf(arguments);
-    } else if (command == QLatin1String("alpha") && arguments.size() == 1) {
+    else if (command == QLatin1String("alpha") && arguments.size() == 1)
         answer = alphaOf(arguments);
-    } else if (command == QLatin1String("changed") && arguments.size() == 2) {
+    else if (command == QLatin1String("changed") && arguments.size() == 2)
         answer = changedBetween(arguments);
-    } else if (command == QLatin1String("pictures") && arguments.size() == 3) {
+    else if (command == QLatin1String("pictures") && arguments.size() == 3)
         answer = comparePictures(arguments);
-    } else if (command == QLatin1String("screen") && arguments.size() == 7) {
+    else if (command == QLatin1String("screen") && arguments.size() == 7)
         answer = compareWithScreen(arguments);
-    }
     if (!answer) {
         QTextStream(stderr) << "titler_pngdiff: wrong use, or pictures that cannot be compared\n";
         return WRONG_USE;

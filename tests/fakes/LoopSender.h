@@ -18,9 +18,8 @@ public:
     {
         const std::unique_ptr<PTC::Event> owner(event);
         lastSize = event->getSize();
-        if (event->getSize() <= 0) {
+        if (event->getSize() <= 0)
             return; // the socket would drop it
-        }
         char* data = new char[static_cast<std::size_t>(event->getSize())];
         std::memcpy(data, event->getData(), static_cast<std::size_t>(event->getSize()));
         m_receiver.recv(new PTC::Event(event->getObjectId(), event->getMethodId(), data, event->getSize(),

@@ -53,10 +53,9 @@ private:
     int nextUntil(qint64 end) const
     {
         int next = 0;
-        for (auto it = mTimers.cbegin(); it != mTimers.cend(); ++it) {
+        for (auto it = mTimers.cbegin(); it != mTimers.cend(); ++it)
             if (it->due <= end && (next == 0 || it->due < mTimers[next].due))
                 next = it.key();
-        }
         return next;
     }
 

@@ -455,10 +455,9 @@ void OperatorSession::nameFolder(const QString& name)
 QModelIndex OperatorSession::rowOf(const QString& folder) const
 {
     const KSTreeModel* model = mFolders->treeModel();
-    for (int row = 0; row < model->rowCount(); ++row) {
+    for (int row = 0; row < model->rowCount(); ++row)
         if (model->index(row, 0).data().toString() == folder)
             return model->index(row, 0);
-    }
     return {};
 }
 
@@ -466,10 +465,9 @@ void OperatorSession::noteNewTitle(const QStringList& before, const QStringList&
 {
     noteList();
     const QString folder = mOpen;
-    for (const QString& stem : mKnown.value(folder).order) {
+    for (const QString& stem : mKnown.value(folder).order)
         if (!before.contains(stem))
             mKnown[folder].texts[stem] = texts;
-    }
 }
 
 Journal::Folders OperatorSession::withTexts(const QString& stem, const QStringList& texts) const

@@ -46,10 +46,9 @@ public:
         QStringList result;
         restore();
         QStringList names;
-        for (QWidget* widget : touchable()) {
+        for (QWidget* widget : touchable())
             if (!names.contains(nameOf(widget)))
                 names.append(nameOf(widget));
-        }
         for (const QString& name : std::as_const(names)) {
             restore();
             QWidget* widget = find(name);
@@ -95,10 +94,9 @@ private:
     static QList<QWidget*> windows()
     {
         QList<QWidget*> result;
-        for (QWidget* window : QApplication::topLevelWidgets()) {
+        for (QWidget* window : QApplication::topLevelWidgets())
             if (window->isVisible() && !(window->windowFlags() & Qt::WindowTransparentForInput))
                 result.append(window);
-        }
         std::sort(result.begin(), result.end(), [](const QWidget* a, const QWidget* b) {
             return std::make_tuple(a->x(), a->y(), a->width(), a->height()) <
                    std::make_tuple(b->x(), b->y(), b->width(), b->height());
@@ -113,12 +111,11 @@ private:
                 continue;
             QList<QWidget*> inside = window->findChildren<QWidget*>();
             inside.prepend(window);
-            for (QWidget* widget : std::as_const(inside)) {
+            for (QWidget* widget : std::as_const(inside))
                 if (widget->window() == window && widget->isVisible() && widget->isEnabled() &&
                     concerns(widget) && widget->testAttribute(Qt::WA_AcceptTouchEvents) &&
                     !placeOn(widget).isNull())
                     result.append(widget);
-            }
         }
         return result;
     }
@@ -160,19 +157,17 @@ private:
     }
     QWidget* find(const QString& name) const
     {
-        for (QWidget* widget : touchable()) {
+        for (QWidget* widget : touchable())
             if (nameOf(widget) == name)
                 return widget;
-        }
         return nullptr;
     }
     // Closes the other popups, since a press outside an open popup would only close it.
     static void closePopupsBeside(const QWidget* widget)
     {
-        for (QWidget* window : windows()) {
+        for (QWidget* window : windows())
             if (window->windowType() == Qt::ToolTip && window != widget->window())
                 window->close();
-        }
         QCoreApplication::processEvents();
     }
 
@@ -312,10 +307,9 @@ private:
             "clicked",     "widgetItemClicked",  "widgetItemReleased",  "pressed",      "sectionClicked",
             "triggered",   "tabBarClicked",      "aboutToShow",         "signalTapped", "itemPressed",
             "editorEvent", "widgetItemLongHold", "signalPressedAndHold"};
-        for (const QString& signal : log.take()) {
+        for (const QString& signal : log.take())
             if (deeds.contains(signal))
                 result.append(signal + QStringLiteral(" followed"));
-        }
         return result + problemsAfterwards(widget, name, cause, answer);
     }
     QStringList problemsAfterwards(QWidget* widget, const QString& name, Cause cause,

@@ -22,19 +22,16 @@ constexpr int TOLERANCE = 5;
 QStringList kept(const QString& page)
 {
     QFile file(QStringLiteral(TITLER_GALLERY_PAGES "/%1.txt").arg(page));
-    if (!file.open(QIODevice::ReadOnly)) {
+    if (!file.open(QIODevice::ReadOnly))
         return QStringList();
-    }
     return QString::fromLatin1(file.readAll()).split(QLatin1Char('\n'), Qt::SkipEmptyParts);
 }
 
 GalleryPages::Maker maker(const QString& name)
 {
-    for (const GalleryPages::Maker& candidate : GalleryPages::all()) {
-        if (candidate().name == name) {
+    for (const GalleryPages::Maker& candidate : GalleryPages::all())
+        if (candidate().name == name)
             return candidate;
-        }
-    }
     return GalleryPages::Maker();
 }
 
@@ -87,9 +84,8 @@ void tst_gallerypages::pagesLookAsKept()
 void tst_gallerypages::everyKeptPageIsShown()
 {
     QStringList names;
-    for (const GalleryPages::Maker& candidate : GalleryPages::all()) {
+    for (const GalleryPages::Maker& candidate : GalleryPages::all())
         names.append(candidate().name + QStringLiteral(".txt"));
-    }
     names.sort();
     QCOMPARE(QDir(QStringLiteral(TITLER_GALLERY_PAGES)).entryList(QDir::Files, QDir::Name), names);
 }

@@ -73,10 +73,9 @@ void tst_gallerypages_interruptions::everyWidget()
     touches.destroy = [this](QWidget* widget) { destroy(widget); };
     QStringList result;
     const QStringList kinds = touches.kinds();
-    for (const QString& name : kinds) {
+    for (const QString& name : kinds)
         for (const QString& problem : touches.problems(name))
             result.append(name + QStringLiteral(" after ") + problem);
-    }
     s_names += kinds;
     QVERIFY2(result.isEmpty(), qPrintable(QLatin1Char('\n') + result.join(QLatin1Char('\n'))));
 }
@@ -87,9 +86,8 @@ void tst_gallerypages_interruptions::everyClassIsThere()
     const QString names = s_names.join(QLatin1Char('\n'));
     for (const char* part :
          {"KSPushbutton", "KSRadiobutton", "KSSLider", "KSCombobox", "CustomComboBoxView", "KSMenu",
-          "KSTabBar", "KSScrollBar", "KSTreeView", "KSBaseItemWidget", "movable", "checkable", "ToolsBar"}) {
+          "KSTabBar", "KSScrollBar", "KSTreeView", "KSBaseItemWidget", "movable", "checkable", "ToolsBar"})
         QVERIFY2(names.contains(QLatin1String(part)), qPrintable(QLatin1String(part) + "\n" + names));
-    }
 }
 
 int main(int argc, char* argv[])

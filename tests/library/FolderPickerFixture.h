@@ -93,10 +93,9 @@ public:
     KSTreeModel* model() const { return picker->treeModel(); }
     QModelIndex row(const QString& name, const QModelIndex& parent = QModelIndex()) const
     {
-        for (int i = 0; i < model()->rowCount(parent); ++i) {
+        for (int i = 0; i < model()->rowCount(parent); ++i)
             if (model()->index(i, 0, parent).data().toString() == name)
                 return model()->index(i, 0, parent);
-        }
         return {};
     }
     QStringList names(const QModelIndex& parent = QModelIndex()) const

@@ -48,10 +48,9 @@ public:
             ArchiveManager().saveArchive(archive.get());
             picture(Qt::blue).save(folder + QLatin1Char('/') + stem + QStringLiteral("_240.png"));
         }
-        if (hasBackground) {
+        if (hasBackground)
             for (const char* name : {"/bg_1280.png", "/bg_1920.png"})
                 picture(Qt::gray).save(folder + QLatin1String(name));
-        }
         writeOrder(folder, stems);
     }
 

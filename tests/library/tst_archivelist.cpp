@@ -86,10 +86,9 @@ private:
     QStringList enabledActions()
     {
         QStringList result;
-        for (const QAction* action : menu()->actions()) {
+        for (const QAction* action : menu()->actions())
             if (action->isEnabled())
                 result.append(action->text());
-        }
         return result;
     }
     static QStringList numbered(int count)
@@ -538,10 +537,9 @@ void tst_archivelist::letterTailsAreWhole()
     const auto ink = [label, letters] {
         const QImage image = label->grab().toImage();
         int pixels = 0;
-        for (int y = 0; y < image.height(); ++y) {
+        for (int y = 0; y < image.height(); ++y)
             for (int x = 0; x < letters; ++x)
                 pixels += image.pixelColor(x, y).lightness() > 128 ? 1 : 0;
-        }
         return pixels;
     };
     const int inTheLine = ink();

@@ -38,10 +38,9 @@ private:
     {
         QRect ink;
         for (int y = 0; y < image.height(); ++y) {
-            for (int x = 0; x < image.width(); ++x) {
+            for (int x = 0; x < image.width(); ++x)
                 if (qAlpha(image.pixel(x, y)) > 127)
                     ink |= QRect(x, y, 1, 1);
-            }
         }
         return ink;
     }

@@ -77,10 +77,9 @@ private:
     Names enabledActions() const
     {
         Names result;
-        for (const QAction* action : m->menu()->actions()) {
+        for (const QAction* action : m->menu()->actions())
             if (action->isEnabled())
                 result.append(action->text());
-        }
         return result;
     }
     void moveMode(bool on) { m->list->moveButtonClicked(on); }

@@ -701,11 +701,10 @@ private Q_SLOTS:
         f.open();
         const auto masked = [this] {
             QRect area;
-            for (const QWidget* child : f.picker->findChildren<QWidget*>(Qt::FindDirectChildrenOnly)) {
+            for (const QWidget* child : f.picker->findChildren<QWidget*>(Qt::FindDirectChildrenOnly))
                 if (child->autoFillBackground() && child->isVisible() &&
                     child->palette().color(QPalette::Window) == QColor(0, 0, 0, 166))
                     area |= child->geometry();
-            }
             return area;
         };
         f.picker->showDialogMaskWidget(true);

@@ -21,10 +21,9 @@ QRect inkIn(const QImage& image, const QColor& background = Qt::transparent)
 {
     QRect ink;
     for (int y = 0; y < image.height(); ++y) {
-        for (int x = 0; x < image.width(); ++x) {
+        for (int x = 0; x < image.width(); ++x)
             if (image.pixelColor(x, y) != background)
                 ink |= QRect(x, y, 1, 1);
-        }
     }
     return ink;
 }

@@ -108,10 +108,9 @@ QRect tst_thumbnailrender_canvas::ink(const QImage& image)
 {
     QRect area;
     for (int y = 0; y < image.height(); ++y) {
-        for (int x = 0; x < image.width(); ++x) {
+        for (int x = 0; x < image.width(); ++x)
             if (qAlpha(image.pixel(x, y)) > 100)
                 area |= QRect(x, y, 1, 1);
-        }
     }
     return area;
 }

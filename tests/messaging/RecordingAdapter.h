@@ -23,9 +23,8 @@ public:
     explicit RecordingAdapter(long id) : PTC::Adapter(id) {}
     ~RecordingAdapter() override
     {
-        if (destroyed != nullptr) {
+        if (destroyed != nullptr)
             *destroyed = true;
-        }
     }
 
     void receive(PTC::Event* event) override

@@ -38,9 +38,8 @@ public:
     TestSocket& operator=(const TestSocket&) = delete;
     ~TestSocket()
     {
-        if (m_socket != -1) {
+        if (m_socket != -1)
             close(m_socket);
-        }
     }
 
     static TestSocket fromDescriptor(int descriptor) { return TestSocket(descriptor, Adopt()); }
@@ -59,9 +58,8 @@ public:
                             bool remote, const QByteArray& payload)
     {
         QByteArray bytes;
-        for (const qint64 value : {receiver, object, method, qint64(0)}) {
+        for (const qint64 value : {receiver, object, method, qint64(0)})
             bytes.append(littleEndian(value));
-        }
         bytes.append(callback ? '\1' : '\0').append(QByteArray(7, '\0'));
         bytes.append(littleEndian(size));
         bytes.append(remote ? '\1' : '\0').append(QByteArray(7, '\0'));
@@ -72,18 +70,16 @@ public:
     static QByteArray littleEndian(qint64 value)
     {
         QByteArray bytes;
-        for (int i = 0; i < 8; ++i) {
+        for (int i = 0; i < 8; ++i)
             bytes.append(static_cast<char>(static_cast<quint64>(value) >> (8 * i)));
-        }
         return bytes;
     }
 
     static qint64 longAt(const QByteArray& bytes, qsizetype offset)
     {
         quint64 value = 0;
-        for (int i = 7; i >= 0; --i) {
+        for (int i = 7; i >= 0; --i)
             value = value << 8 | static_cast<unsigned char>(bytes.at(offset + i));
-        }
         return static_cast<qint64>(value);
     }
 
@@ -101,13 +97,12 @@ public:
         while (sent < bytes.size()) {
             const ssize_t n = send(m_socket, bytes.constData() + sent,
                                    static_cast<size_t>(bytes.size() - sent), MSG_NOSIGNAL);
-            if (n > 0) {
+            if (n > 0)
                 sent += n;
-            } else if (n == -1 && errno == EAGAIN) {
+            else if (n == -1 && errno == EAGAIN)
                 waitFor(POLLOUT, PATIENCE_MS);
-            } else {
+            else
                 return false;
-            }
         }
         return true;
     }
@@ -122,11 +117,10 @@ public:
                 readAvailable();
                 const ssize_t n = send(m_socket, block.constData() + sent,
                                        static_cast<size_t>(block.size() - sent), MSG_NOSIGNAL | MSG_DONTWAIT);
-                if (n > 0) {
+                if (n > 0)
                     sent += n;
-                } else if (!waitFor(POLLOUT, 700)) {
+                else if (!waitFor(POLLOUT, 700))
                     return i;
-                }
             }
         }
         return count;
@@ -138,9 +132,8 @@ public:
         QByteArray bytes;
         QDeadlineTimer deadline(PATIENCE_MS);
         while (bytes.size() < count && !deadline.hasExpired()) {
-            if (!waitFor(POLLIN, 100)) {
+            if (!waitFor(POLLIN, 100))
                 continue;
-            }
             char buffer[20480];
             const auto want = static_cast<size_t>(qMin<qsizetype>(count - bytes.size(), sizeof buffer));
             const ssize_t n = recv(m_socket, buffer, want, MSG_DONTWAIT);
@@ -218,9 +211,8 @@ public:
         setsockopt(m_socket, SOL_SOCKET, SO_REUSEADDR, &on, sizeof on);
         const sockaddr_in address = TestSocket::addressOf(client);
         if (::bind(m_socket, reinterpret_cast<const sockaddr*>(&address), sizeof address) != 0 ||
-            listen(m_socket, 10) != 0) {
+            listen(m_socket, 10) != 0)
             qFatal("cannot listen");
-        }
     }
     ~TestListener() { close(m_socket); }
     TestListener(const TestListener&) = delete;

@@ -33,9 +33,8 @@ QString text(const std::wstring& wide)
 QJsonArray texts(const std::wstring* wide, int count)
 {
     QJsonArray array;
-    for (int i = 0; i < count; ++i) {
+    for (int i = 0; i < count; ++i)
         array.append(text(wide[i]));
-    }
     return array;
 }
 
@@ -48,9 +47,8 @@ QJsonObject describe(const FileManagerDefine::tagRenameNotify& r)
 QJsonObject describe(const FileManagerDefine::tagImportNotify& r)
 {
     QJsonArray last;
-    for (const int value : r.last) {
+    for (const int value : r.last)
         last.append(value);
-    }
     return {{"fileType", r.fileType},
             {"fileTypeHigh", r.fileTypeHigh},
             {"third", r.third},
@@ -164,9 +162,8 @@ public:
             QCoreApplication::quit();
             return;
         }
-        if (method < 1 || method > static_cast<long>(ECHOES.size())) {
+        if (method < 1 || method > static_cast<long>(ECHOES.size()))
             return;
-        }
         const Echo answer = ECHOES[static_cast<std::size_t>(method - 1)](event->getData(), event->getSize());
         std::puts(QJsonDocument(answer.description).toJson(QJsonDocument::Compact).constData());
         std::fflush(stdout);
@@ -184,17 +181,15 @@ int main(int argc, char** argv)
 {
     QCoreApplication application(argc, argv);
     SocketRemoteSender sender(ServiceTable::TITLER_CLIENT_KEY);
-    if (!sender.initialize(ServiceTable::MAIN_CLIENT)) {
+    if (!sender.initialize(ServiceTable::MAIN_CLIENT))
         return 1;
-    }
     PTC::CallbackProxy peer(ECHO_ADAPTER, true);
     peer.setSender(&sender);
     SocketRemoteReceiver listener(0);
     auto* receiver = new PTC::QtReceiver(ServiceTable::TITLER_CLIENT_KEY);
     receiver->addAdapter(new EchoAdapter(peer));
     listener.addReceiver(receiver);
-    if (!listener.initialize(ServiceTable::TITLER_CLIENT)) {
+    if (!listener.initialize(ServiceTable::TITLER_CLIENT))
         return 1;
-    }
     return QCoreApplication::exec();
 }

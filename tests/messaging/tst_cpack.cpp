@@ -20,9 +20,8 @@ bool allocationsFail = false;
 
 void* countingMalloc(unsigned long size)
 {
-    if (allocationsFail) {
+    if (allocationsFail)
         return nullptr;
-    }
     ++allocations;
     return std::malloc(size);
 }

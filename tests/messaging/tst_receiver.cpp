@@ -37,9 +37,8 @@ public:
     }
     ~KeepingSender() override
     {
-        if (m_destroyed != nullptr) {
+        if (m_destroyed != nullptr)
             *m_destroyed = true;
-        }
     }
     void send(PTC::Event* event) override { last.reset(event); }
 
@@ -66,9 +65,8 @@ public:
     void createInstance(long, void**) override {}
     PTC::IAdapterBase* createAdapter(long type, PTC::IReceiver* receiver, void* target) override
     {
-        if (type != 7) {
+        if (type != 7)
             return nullptr;
-        }
         auto* adapter = new RecordingAdapter(40);
         adapter->setTarget(target);
         receiver->addCBAdapter(adapter);
@@ -151,11 +149,10 @@ void tst_receiver::receiverOwnsItsAdapters()
         for (int i = 0; i < 3; ++i) {
             auto* adapter = new RecordingAdapter(i / 2);
             adapter->destroyed = &gone[i];
-            if (i == 2) {
+            if (i == 2)
                 receiver.addCBAdapter(adapter);
-            } else {
+            else
                 receiver.addAdapter(adapter);
-            }
         }
         QVERIFY(!gone[0] && !gone[1] && !gone[2]);
     }
@@ -199,9 +196,8 @@ void tst_receiver::qtReceiverHandlesInItsThread()
     QCOMPARE(adapter->calls.front().thread, QThread::currentThread());
     QCOMPARE(adapter->calls.front().payload, QByteArray("abc"));
     // The receiver's own thread is never held up.
-    for (int i = 0; i < PTC::QtReceiver::MAX_PENDING_EVENTS * 2; ++i) {
+    for (int i = 0; i < PTC::QtReceiver::MAX_PENDING_EVENTS * 2; ++i)
         receiver.recv(new PTC::Event(3, 8, newData("d"), 1, true, false));
-    }
     QTRY_COMPARE(adapter->calls.size(), 1 + PTC::QtReceiver::MAX_PENDING_EVENTS * 2);
 }
 

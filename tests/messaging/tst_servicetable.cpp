@@ -146,9 +146,8 @@ private:
     void add(const char* method, const QVariantList& values)
     {
         QStringList texts;
-        for (const QVariant& value : values) {
+        for (const QVariant& value : values)
             texts.append(value.toString());
-        }
         m_calls.append(QString(method) + "(" + texts.join(",") + ")");
     }
 
@@ -220,9 +219,8 @@ PTC::IAdapterBase* tst_servicetable::createAdapter(long type, PTC::IReceiver* re
 
 PTC::IProxyBase* tst_servicetable::createProxy(long type, long id, long client)
 {
-    if (client != MY_CLIENT) {
+    if (client != MY_CLIENT)
         return nullptr;
-    }
     PTC::CallbackProxy* proxy = type == TitlerAdapter::CALLBACK_INTERFACE_ID
                                     ? new TitlerCallBackRemoteProxy(id)
                                     : ServiceFamilies::createClientProxy(type, id);
@@ -242,9 +240,8 @@ void tst_servicetable::init()
                                 const QJsonObject& args, std::unique_ptr<PTC::IProxyBase> proxy) {
                 m_calls.append(QString(called.name) + "." + method.name + " " +
                                QJsonDocument(args).toJson(QJsonDocument::Compact));
-                if (proxy != nullptr) {
+                if (proxy != nullptr)
                     m_peers.push_back(std::move(proxy));
-                }
             });
         adapter->setProxyFactory(this);
         m_server->addAdapter(adapter);
@@ -535,9 +532,8 @@ void tst_servicetable::unknownMethodsLeaveTheTargetAlone()
     for (const ServiceTable::Service& entry : ServiceTable::services()) {
         for (const long type : {entry.callBackAdapter, entry.notifyAdapter}) {
             const std::unique_ptr<PTC::IAdapterBase> adapter(ServiceFamilies::createAdapter(type, 1));
-            if (adapter == nullptr) {
+            if (adapter == nullptr)
                 continue;
-            }
             char payload[4] = {};
             adapter->setTarget(reinterpret_cast<void*>(1)); // a call of it would crash
             for (const long method : {0L, -1L, 99L, 1L << 40}) {
@@ -579,9 +575,8 @@ void tst_servicetable::randomPayloadsReachNothingBad()
         for (int round = 0; round < 300; ++round) {
             const long size = static_cast<long>(random() % 40) + 1;
             const std::unique_ptr<char[]> payload(new char[static_cast<std::size_t>(size)]);
-            for (long i = 0; i < size; ++i) {
+            for (long i = 0; i < size; ++i)
                 payload[static_cast<std::size_t>(i)] = static_cast<char>(random());
-            }
             PTC::Event event(1, static_cast<long>(random() % 12), payload.get(), size, true, true);
             adapter.receive(&event);
         }
@@ -685,19 +680,15 @@ void tst_servicetable::tableOfServices()
         QVERIFY(service.methods > 0);
         QCOMPARE(service.port, service.clientKey == 3 ? 1002L : 1000L);
         QVERIFY(ServiceTable::findByInterface(service.interfaceId) == &service);
-        for (const long type : {service.callBackAdapter, service.notifyAdapter}) {
-            if (type != ServiceTable::NO_ADAPTER) {
+        for (const long type : {service.callBackAdapter, service.notifyAdapter})
+            if (type != ServiceTable::NO_ADAPTER)
                 QVERIFY(adapterTypes.insert(type).second);
-            }
-        }
     }
     QCOMPARE(adapterTypes.size(), std::size_t(63));
-    for (const long unknown : {0L, 117L, 118L, 2L, -1L, 1000L}) {
+    for (const long unknown : {0L, 117L, 118L, 2L, -1L, 1000L})
         QVERIFY(ServiceTable::findByInterface(unknown) == nullptr);
-    }
-    for (const long unknown : {0L, 1L, 117L, 118L, 39L}) {
+    for (const long unknown : {0L, 1L, 117L, 118L, 39L})
         QVERIFY(!adapterTypes.contains(unknown));
-    }
     QCOMPARE(QString(ServiceTable::findByInterface(110)->name), "SubPanelController");
     QCOMPARE(ServiceTable::findByInterface(110)->methods, 54);
     QCOMPARE(ServiceTable::findByInterface(110)->notifyAdapter, 111L);
@@ -723,16 +714,14 @@ void tst_servicetable::familiesOfServices()
 void tst_servicetable::senderKeys()
 {
     const long keys[] = {1, 2, 3, 4, 5, 6, 4, 7, 8};
-    for (long client = 1000; client <= 1008; ++client) {
+    for (long client = 1000; client <= 1008; ++client)
         QCOMPARE(ServiceTable::senderKeyOf(client), keys[client - 1000]);
-    }
     for (const long other : {0L, -1L, 999L, 1009L, 1L << 40}) {
         QCOMPARE(ServiceTable::senderKeyOf(other), 4L);
         QVERIFY(!ServiceTable::isSibling(other));
     }
-    for (long client = 1000; client <= 1008; ++client) {
+    for (long client = 1000; client <= 1008; ++client)
         QCOMPARE(ServiceTable::isSibling(client), client != 1003); // which is this process
-    }
 }
 
 QTEST_GUILESS_MAIN(tst_servicetable)

@@ -167,10 +167,9 @@ public:
     }
     QStringList lines(const QString& heading) const
     {
-        for (auto at = m_lines.cbegin(); at != m_lines.cend(); ++at) {
+        for (auto at = m_lines.cbegin(); at != m_lines.cend(); ++at)
             if (at.key().startsWith(heading))
                 return at.value();
-        }
         return {};
     }
 
@@ -205,10 +204,9 @@ void tst_servicetable_protocol::offeredService()
                                              .arg(ITitler::CLIENT)
                                              .arg(ServiceTable::TITLER_CLIENT_KEY)));
     QStringList rows;
-    for (const QStringList& cells : m_page.cells("5. ")) {
+    for (const QStringList& cells : m_page.cells("5. "))
         if (cells.first() != "Method id")
             rows.append(cells.join(' '));
-    }
     QCOMPARE(rows, m_program.rows["ITitler"] + m_program.rows["ITitlerCallBack"]);
 }
 
@@ -261,10 +259,9 @@ void tst_servicetable_protocol::records()
 void tst_servicetable_protocol::allServices()
 {
     QStringList rows;
-    for (const QStringList& cells : m_page.cells("8. ")) {
+    for (const QStringList& cells : m_page.cells("8. "))
         if (cells.first() != "Interface id")
             rows.append(cells.join(' '));
-    }
     const auto adapter = [](long type) {
         return type == ServiceTable::NO_ADAPTER ? QString("none") : QString::number(type);
     };

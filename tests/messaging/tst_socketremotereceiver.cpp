@@ -156,9 +156,8 @@ void tst_socketremotereceiver::badSizesAreDropped_data()
 {
     QTest::addColumn<qint64>("size");
     for (const qint64 size : {qint64(-1), std::numeric_limits<qint64>::min(), qint64(20425), qint64(20480),
-                              qint64(1) << 32, qint64(1) << 62, std::numeric_limits<qint64>::max()}) {
+                              qint64(1) << 32, qint64(1) << 62, std::numeric_limits<qint64>::max()})
         QTest::addRow("%lld", static_cast<long long>(size)) << size;
-    }
 }
 
 void tst_socketremotereceiver::badSizesAreDropped()
@@ -236,9 +235,8 @@ void tst_socketremotereceiver::dozensOfConnections()
 {
     // The accept loop takes two a second; the others wait in the backlog and are served in turn.
     std::vector<std::unique_ptr<TestSocket>> peers;
-    for (int i = 0; i < 24; ++i) {
+    for (int i = 0; i < 24; ++i)
         peers.push_back(std::make_unique<TestSocket>(SERVER, TestSocket::DoNotWait));
-    }
     int written = 0;
     for (const auto& peer : peers) {
         if (written++ % 6 == 0) {
@@ -261,9 +259,8 @@ void tst_socketremotereceiver::fiveThousandReconnections()
         QVERIFY(peer.write("x"));
         QCOMPARE(peer.read(3), QByteArray("OK\0", 3));
         peer.resetAtEnd();
-        if (i % 500 == 0) {
+        if (i % 500 == 0)
             QTRY_VERIFY(openDescriptors() <= before + SocketRemoteReceiver::MAX_ENDED_CONNECTIONS + 3);
-        }
     }
     // The sockets of those that ended last are kept.
     QTRY_COMPARE(openDescriptors(), before + SocketRemoteReceiver::MAX_ENDED_CONNECTIONS);
@@ -303,9 +300,8 @@ void tst_socketremotereceiver::randomFrames()
     std::srand(seed);
     for (int i = 0; i < 50; ++i) {
         QByteArray noise(20480, '\0');
-        for (char& byte : noise) {
+        for (char& byte : noise)
             byte = static_cast<char>(std::rand());
-        }
         peer.write(noise);
         peer.readAvailable();
     }
@@ -398,9 +394,8 @@ void tst_socketremotereceiver::senderRefusesOversize()
     SocketRemoteSender sender(4);
     QVERIFY(sender.initialize(SERVER));
     QByteArray large(30000, 'L');
-    for (const long size : {20425L, 30000L, 1L << 62, -1L}) {
+    for (const long size : {20425L, 30000L, 1L << 62, -1L})
         sender.send(new PTC::Event(1, 1, large.data(), size, true, false));
-    }
     sender.send(new PTC::Event(1, 2, large.data(), 3, true, false));
     TestSocket peer = listener.accept();
     QCOMPARE(peer.read(20480).mid(16, 1), QByteArray(1, '\2'));
@@ -430,9 +425,8 @@ void tst_socketremotereceiver::senderDrainsAtMostTenBytes()
     peer.write(QByteArray("OK\0", 3).repeated(acknowledgements));
     char payload[4] = {};
     QTRY_VERIFY(peer.everythingDelivered());
-    for (int i = 0; i < calls; ++i) {
+    for (int i = 0; i < calls; ++i)
         sender->send(new PTC::Event(1, i, payload, 4, true, false));
-    }
     QCOMPARE(peer.read(calls * 20480).size(), calls * 20480);
     // A socket that is closed with unread bytes resets the connection, one without ends it in order.
     sender.reset();
@@ -464,9 +458,8 @@ void tst_socketremotereceiver::senderWhosePeerDied()
         TestSocket peer = listener.accept();
     }
     QTRY_VERIFY(!sender.isConnected());
-    for (int i = 0; i < 5; ++i) { // SIGPIPE would end this program
+    for (int i = 0; i < 5; ++i) // SIGPIPE would end this program
         sender.send(new PTC::Event(1, 1, payload, 4, true, false));
-    }
     QVERIFY(!sender.isConnected());
 }
 
@@ -483,9 +476,8 @@ void tst_socketremotereceiver::senderSurvivesABlockedPeer()
         }
     });
     char payload[4] = {};
-    for (int i = 0; i < 800; ++i) {
+    for (int i = 0; i < 800; ++i)
         sender->send(new PTC::Event(1, i, payload, 4, true, false));
-    }
     const bool connected = sender->isConnected();
     sender.reset(); // ends the reader
     reader.join();

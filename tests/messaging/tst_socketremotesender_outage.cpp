@@ -44,9 +44,8 @@ std::vector<std::unique_ptr<TestSocket>> fillBacklog()
     for (int i = 0; i < 64; ++i) {
         fillers.push_back(std::make_unique<TestSocket>(PEER, TestSocket::DoNotWait));
         QTest::qWait(5);
-        if (!fillers.back()->isConnected()) {
+        if (!fillers.back()->isConnected())
             break;
-        }
     }
     return fillers;
 }
@@ -114,9 +113,8 @@ void tst_socketremotesender_outage::aPeerThatDoesNotReadHoldsNobodyUp()
     TestSocket peer = listener.accept();
     QElapsedTimer timer;
     timer.start();
-    for (int i = 0; i < FLOOD; ++i) {
+    for (int i = 0; i < FLOOD; ++i)
         call(sender, i);
-    }
     QVERIFY2(timer.elapsed() < MOST_GUI_MS, qPrintable(QString::number(timer.elapsed())));
     QVERIFY(sender.isConnected());
     QCOMPARE(logLines(), 1);
@@ -128,9 +126,8 @@ void tst_socketremotesender_outage::aPeerThatReadsAgainGetsTheNewestCalls()
     SocketRemoteSender sender(4);
     QVERIFY(sender.initialize(PEER));
     TestSocket peer = listener.accept();
-    for (int i = 0; i < FLOOD; ++i) {
+    for (int i = 0; i < FLOOD; ++i)
         call(sender, i);
-    }
     // Whole frames in their order, without those that were dropped, and all of the newest.
     qint64 last = -1;
     int received = 0;
@@ -150,9 +147,8 @@ void tst_socketremotesender_outage::aPeerThatReadsAgainGetsTheNewestCalls()
     }
     QCOMPARE(logLines(), 1);
     // A second outage is a line of its own.
-    for (int i = 0; i < FLOOD; ++i) {
+    for (int i = 0; i < FLOOD; ++i)
         call(sender, i);
-    }
     QCOMPARE(logLines(), 2);
 }
 
@@ -161,11 +157,10 @@ void tst_socketremotesender_outage::aPeerThatWasStartedAnewIsReached()
     SocketRemoteSender sender(4);
     for (int start = 0; start < 3; ++start) {
         TestListener listener(PEER);
-        if (start == 0) {
+        if (start == 0)
             QVERIFY(sender.initialize(PEER));
-        } else {
+        else
             QVERIFY(!sender.isConnected());
-        }
         call(sender, start);
         TestSocket peer = listener.accept();
         QCOMPARE(methodOf(peer.read(SocketFrame::FRAME_SIZE)), qint64(start));
@@ -184,9 +179,8 @@ void tst_socketremotesender_outage::aStuckPeerThatWasStartedAnewIsReached()
         TestListener listener(PEER);
         QVERIFY(sender.initialize(PEER));
         TestSocket peer = listener.accept();
-        for (int i = 0; i < FLOOD; ++i) {
+        for (int i = 0; i < FLOOD; ++i)
             call(sender, i);
-        }
     }
     TestListener listener(PEER);
     call(sender, FLOOD);
@@ -207,15 +201,13 @@ void tst_socketremotesender_outage::aPeerThatClosesEachConnectionEndsTheTry()
     SocketRemoteSender sender(4);
     QVERIFY(sender.initialize(PEER));
     auto peer = std::make_unique<TestSocket>(listener.accept());
-    for (int i = 0; i < FLOOD; ++i) {
+    for (int i = 0; i < FLOOD; ++i)
         call(sender, i);
-    }
     std::atomic<bool> isOver = false;
     std::thread closer([&] {
         peer.reset();
-        while (!isOver) {
+        while (!isOver)
             listener.accept();
-        }
     });
     QTRY_COMPARE(logLines(), 1);
     sender.finish(std::chrono::steady_clock::now() + std::chrono::seconds(1));
@@ -268,9 +260,8 @@ void tst_socketremotesender_outage::callsWaitForAListenerWithoutRoom()
     SocketRemoteSender sender(4);
     sender.setConnectTimeout(60000);
     QVERIFY(sender.beginConnect(PEER));
-    for (int i = 0; i < 3; ++i) {
+    for (int i = 0; i < 3; ++i)
         call(sender, i);
-    }
     std::vector<std::unique_ptr<TestSocket>> accepted;
     QByteArray received;
     QDeadlineTimer deadline(60000);
@@ -280,9 +271,8 @@ void tst_socketremotesender_outage::callsWaitForAListenerWithoutRoom()
         received = accepted.back()->read(3 * SocketFrame::FRAME_SIZE);
     }
     QCOMPARE(received.size(), qsizetype(3 * SocketFrame::FRAME_SIZE));
-    for (int i = 0; i < 3; ++i) {
+    for (int i = 0; i < 3; ++i)
         QCOMPARE(methodOf(received.mid(i * SocketFrame::FRAME_SIZE, SocketFrame::FRAME_SIZE)), qint64(i));
-    }
     QCOMPARE(logLines(), 0);
 }
 
@@ -293,9 +283,8 @@ void tst_socketremotesender_outage::endingWaitsForWhatIsOnItsWay()
     QVERIFY(sender->initialize(PEER));
     TestSocket peer = listener.accept();
     int sent = 0;
-    while (logLines() == 0) { // until all that can wait does
+    while (logLines() == 0) // until all that can wait does
         call(*sender, sent++);
-    }
     qint64 last = -1;
     std::thread reader([&peer, &last] {
         std::this_thread::sleep_for(std::chrono::milliseconds(50));
@@ -319,9 +308,8 @@ void tst_socketremotesender_outage::endingDoesNotWaitForAStuckPeer()
     auto sender = std::make_unique<SocketRemoteSender>(4);
     QVERIFY(sender->initialize(PEER));
     TestSocket peer = listener.accept();
-    for (int i = 0; i < FLOOD; ++i) {
+    for (int i = 0; i < FLOOD; ++i)
         call(*sender, i);
-    }
     QElapsedTimer timer;
     timer.start();
     sender.reset();

@@ -186,9 +186,8 @@ void tst_wirerecord::everyTruncation()
             const Message cut(c.whole.left(length));
             const QByteArray read = c.again(cut.data(), cut.size());
             QVERIFY2(read != c.whole, c.name);
-            if (length == 0) {
+            if (length == 0)
                 QVERIFY2(read == c.empty, c.name);
-            }
         }
         QVERIFY2(c.again(nullptr, 100) == c.empty, c.name);
         const Message whole(c.whole);
@@ -204,9 +203,8 @@ void tst_wirerecord::randomPayloads()
     for (const Case& c : m_cases) {
         for (int round = 0; round < 2000; ++round) {
             QByteArray noise(static_cast<qsizetype>(random() % 64), '\0');
-            for (char& byte : noise) {
+            for (char& byte : noise)
                 byte = static_cast<char>(random());
-            }
             const Message message(noise);
             const QByteArray read = c.again(message.data(), message.size());
             const Message packedAgain(read);

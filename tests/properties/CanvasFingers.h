@@ -20,11 +20,10 @@ public:
         , m_scene(*window.findChild<CanvasScene*>())
     {
         const QList<QAction*> actions = window.findChildren<QAction*>(QString(), Qt::FindDirectChildrenOnly);
-        for (QAction* action : actions) {
+        for (QAction* action : actions)
             if (action->text().startsWith(QLatin1String("Undo")) ||
                 action->text().startsWith(QLatin1String("Redo")))
                 m_undoAndRedo.append(action);
-        }
     }
 
     // Returns the actions of the window's undo stack.
@@ -97,12 +96,11 @@ private:
     void passTime()
     {
         const QList<GraphicsText*> texts = m_scene.getTextItemList();
-        for (GraphicsText* text : texts) {
+        for (GraphicsText* text : texts)
             if (below(2) == 0)
                 text->slotLongPressed();
             else
                 text->pushLastEditTextIntoStack();
-        }
     }
 
     QList<QAction*> m_undoAndRedo;

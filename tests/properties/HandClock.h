@@ -21,10 +21,9 @@ public:
         for (;;) {
             updateTimers();
             auto next = m_timers.end();
-            for (auto timer = m_timers.begin(); timer != m_timers.end(); ++timer) {
+            for (auto timer = m_timers.begin(); timer != m_timers.end(); ++timer)
                 if (next == m_timers.end() || timer->due < next->due)
                     next = timer;
-            }
             if (next == m_timers.end() || next->due > end)
                 break;
             m_now = std::max(m_now, next->due);

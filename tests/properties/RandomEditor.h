@@ -83,10 +83,9 @@ private:
     GraphicsText* editing()
     {
         const QList<GraphicsText*> texts = m_canvas.scene->getTextItemList();
-        for (GraphicsText* item : texts) {
+        for (GraphicsText* item : texts)
             if (item->textInteractionFlags() == Qt::TextEditorInteraction)
                 return item;
-        }
         GraphicsText* item = anyText();
         if (!item)
             return nullptr;
@@ -222,10 +221,9 @@ private:
         const int id = below(11);
         const TText original = sent(*item);
         const bool preview = !StyleProperties::isOverall(id) && below(3) == 0 && item->getStatusId() != 2;
-        if (preview) {
+        if (preview)
             for (int i = 0; i < 3; ++i)
                 send(original, id, below(2), 0);
-        }
         if (preview && below(2) == 0) {
             TText cancel = original;
             m_canvas.scene->slotChangeObjectTextStyle(&cancel, id, 2);

@@ -43,15 +43,13 @@ public:
             const QStringList stems = stemsIn(folder.filePath());
             const ino_t inode = inodeOf(folder.filePath());
             now[inode] = stems;
-            for (const QString& stem : m_titles.value(inode)) {
+            for (const QString& stem : m_titles.value(inode))
                 if (!stems.contains(stem) && !m_mayGo[inode].contains(stem))
                     wrong.append(QString("lost: %1 of %2").arg(stem, folder.fileName()));
-            }
         }
-        for (auto known = m_titles.keyBegin(); known != m_titles.keyEnd(); ++known) {
+        for (auto known = m_titles.keyBegin(); known != m_titles.keyEnd(); ++known)
             if (!now.contains(*known))
                 wrong.append(QString("lost: a folder with %1").arg(m_titles.value(*known).join(' ')));
-        }
         m_titles = now;
         for (const QString& root : {m_files.titleRoot(), m_files.userRoot()})
             readAll(root, withPictures, wrong);

@@ -184,11 +184,10 @@ private:
     QPoint pointOnMoveButton()
     {
         const auto buttons = m_list.parentWidget()->findChildren<QPushButton*>();
-        for (QPushButton* button : buttons) {
+        for (QPushButton* button : buttons)
             if (button->isVisible() &&
                 (button->text() == TitlerWindow::tr("Move") || button->text() == TitlerWindow::tr("Done")))
                 return pointOn(button);
-        }
         return pointOnList();
     }
     QPoint pointOnList()
@@ -287,10 +286,9 @@ private:
         QString folder = m_root + '/' + anyOf(names);
         if (below(3) != 0)
             return folder;
-        for (const QString& name : names) {
+        for (const QString& name : names)
             if (TitleAccount::stemsIn(m_root + '/' + name).size() > TitleAccount::stemsIn(folder).size())
                 folder = m_root + '/' + name;
-        }
         return folder;
     }
 

@@ -250,14 +250,12 @@ private:
         const auto carriedAt = [&](int index) {
             return m_places[size_t(index)].carried.count({id, object.carried}) > 0;
         };
-        for (int i = m_index; i >= 0 && unchangedAt(i); --i) {
+        for (int i = m_index; i >= 0 && unchangedAt(i); --i)
             if (carriedAt(i))
                 return true;
-        }
-        for (int i = m_index + 1; i < int(m_places.size()) && unchangedAt(i); ++i) {
+        for (int i = m_index + 1; i < int(m_places.size()) && unchangedAt(i); ++i)
             if (carriedAt(i))
                 return true;
-        }
         return false;
     }
     void pushed()

@@ -3,8 +3,8 @@
 // plain list of names.
 //
 // TITLER_STEPS changes the length, TITLER_SEED the course.
-#include "tests/library/TemplateFixture.h"
 #include "tests/library/ItemLooks.h"
+#include "tests/library/TemplateFixture.h"
 
 #include "library/TemplateItem.h"
 #include "library/TemplatePicker.h"
@@ -310,10 +310,9 @@ QString tst_templatepicker_steps::verify() const
     const Archive* chosen = tab()->selectedArchive();
     if ((chosen ? TemplateTab::templateName(*chosen) : QString()) != mChosen)
         return "chosen is another than " + mChosen;
-    for (const char* button : {"selectUserButton", "deleteTemplateButton"}) {
+    for (const char* button : {"selectUserButton", "deleteTemplateButton"})
         if (mPicker->findChild<KSPushbutton*>(button)->isEnabled() == mChosen.isEmpty())
             return QLatin1String(button) + QStringLiteral(" with the choice ") + mChosen;
-    }
     if (mPicker->findChild<QLabel*>("fileName")->text().isEmpty() != mChosen.isEmpty())
         return "the name beside the grid";
     return {};

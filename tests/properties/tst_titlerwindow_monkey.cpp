@@ -40,7 +40,7 @@ constexpr int DEFAULT_TOUCHES = 1000;
 constexpr int DEFAULT_TOUCHES = 5000;
 #endif
 constexpr int TOUCHES_FOR_ALL = 5000; // from which on everything must happen
-constexpr int MOST_ROUNDS = 4;       // as often as that many touches
+constexpr int MOST_ROUNDS = 4;        // as often as that many touches
 constexpr int DEFAULT_SEED = 20261;
 constexpr int TOUCHES_PER_FRAME = 16;
 constexpr int TOUCHES_PER_GLANCE = 40; // at what is shown
@@ -194,10 +194,9 @@ void tst_titlerwindow_monkey::makeFolders()
                       QString::fromUtf8("ひと"), QStringLiteral("last")};
     for (const QString& name : names) {
         const QString folder = mFiles.makeFolder(name);
-        if (name == names.last()) {
+        if (name == names.last())
             for (int i = int(stems.size()); i < 99; ++i)
                 stems.append(QStringLiteral("%1").arg(i, 3, 10, QLatin1Char('0')));
-        }
         if (name != QLatin1String("empty"))
             LibraryFixture::fillFolder(folder, stems);
     }
@@ -274,10 +273,9 @@ bool tst_titlerwindow_monkey::isEnough() const
 QStringList tst_titlerwindow_monkey::missed() const
 {
     QStringList missed;
-    for (const char* what : MUST_HAPPEN) {
+    for (const char* what : MUST_HAPPEN)
         if (mCounts.value(QLatin1String(what)) == 0)
             missed.append(QLatin1String(what));
-    }
     return missed;
 }
 
@@ -335,10 +333,9 @@ QString tst_titlerwindow_monkey::glance() const
     const QList<GraphicsText*> texts = scene()->getTextItemList();
     if (texts.size() > CanvasScene::MAX_TEXT_OBJECTS)
         return QString("%1 texts").arg(texts.size());
-    for (const GraphicsText* text : texts) {
+    for (const GraphicsText* text : texts)
         if (!inStep(*text))
             return "out of step: " + text->toPlainText();
-    }
     if (mWindow->isHidden() && (folders()->isVisible() || templates()->isVisible()))
         return QStringLiteral("a dialog of a hidden window shows");
     return list()->getMoveState() ? QString() : glanceAtList();

@@ -120,9 +120,8 @@ QColor PictureMeasures::inkOf(const QImage& picture)
     for (int y = 0; y < picture.height(); ++y) {
         for (int x = 0; x < picture.width(); ++x) {
             const QRgb pixel = picture.pixel(x, y);
-            if (qAlpha(pixel) == 255 && ++counts[pixel] > counts.value(most)) {
+            if (qAlpha(pixel) == 255 && ++counts[pixel] > counts.value(most))
                 most = pixel;
-            }
         }
     }
     return counts.isEmpty() ? QColor() : QColor(most);
@@ -132,11 +131,9 @@ QRect PictureMeasures::inkRect(const QImage& picture)
 {
     QRect rect;
     for (int y = 0; y < picture.height(); ++y) {
-        for (int x = 0; x < picture.width(); ++x) {
-            if (qAlpha(picture.pixel(x, y)) >= 128) {
+        for (int x = 0; x < picture.width(); ++x)
+            if (qAlpha(picture.pixel(x, y)) >= 128)
                 rect |= QRect(x, y, 1, 1);
-            }
-        }
     }
     return rect;
 }
@@ -151,9 +148,8 @@ QImage PictureMeasures::threePieces(const QString& base, const QStringList& name
     setScaling(painter, scaling);
     const int room = size.width() - first.width() - last.width();
     painter.drawImage(QRect(0, 0, first.width(), size.height()), first);
-    if (room > 0) {
+    if (room > 0)
         painter.drawImage(QRect(first.width(), 0, room, size.height()), QImage(base + names.at(1)));
-    }
     painter.drawImage(QRect(size.width() - last.width(), 0, last.width(), size.height()), last);
     return image;
 }
@@ -168,9 +164,8 @@ QImage PictureMeasures::threePiecesDown(const QString& base, const QStringList& 
     setScaling(painter, scaling);
     const int room = size.height() - first.height() - last.height();
     painter.drawImage(QRect(0, 0, size.width(), first.height()), first);
-    if (room > 0) {
+    if (room > 0)
         painter.drawImage(QRect(0, first.height(), size.width(), room), QImage(base + names.at(1)));
-    }
     painter.drawImage(QRect(0, size.height() - last.height(), size.width(), last.height()), last);
     return image;
 }
@@ -199,21 +194,17 @@ QImage PictureMeasures::ninePieces(const QString& prefix, const QSize& size, Sca
 int PictureMeasures::largestStepAcross(const QImage& image, int from, int to)
 {
     int largest = 0;
-    for (int y = 0; y < image.height(); ++y) {
-        for (int x = from; x < to; ++x) {
+    for (int y = 0; y < image.height(); ++y)
+        for (int x = from; x < to; ++x)
             largest = qMax(largest, step(image.pixel(x, y), image.pixel(x + 1, y)));
-        }
-    }
     return largest;
 }
 
 int PictureMeasures::largestStepDown(const QImage& image, int from, int to)
 {
     int largest = 0;
-    for (int y = from; y < to; ++y) {
-        for (int x = 0; x < image.width(); ++x) {
+    for (int y = from; y < to; ++y)
+        for (int x = 0; x < image.width(); ++x)
             largest = qMax(largest, step(image.pixel(x, y), image.pixel(x, y + 1)));
-        }
-    }
     return largest;
 }

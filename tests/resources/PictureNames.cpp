@@ -34,15 +34,13 @@ QStringList PictureNames::literals(const QString& source)
     auto matches = token.globalMatch(source);
     while (matches.hasNext()) {
         const auto match = matches.next();
-        if (!match.capturedView().startsWith(QLatin1Char('"'))) {
+        if (!match.capturedView().startsWith(QLatin1Char('"')))
             continue;
-        }
         const bool isContinued = end >= 0 && source.mid(end, match.capturedStart() - end).trimmed().isEmpty();
-        if (isContinued) {
+        if (isContinued)
             result.last() += match.captured(1);
-        } else {
+        else
             result.append(match.captured(1));
-        }
         end = match.capturedEnd();
     }
     return result;
@@ -55,19 +53,15 @@ QStringList PictureNames::paths(const QString& literal)
     static const QRegularExpression fixedPart(QStringLiteral("[A-Za-z]"));
     QStringList result;
     auto urls = url.globalMatch(literal);
-    while (urls.hasNext()) {
+    while (urls.hasNext())
         result.append(urls.next().captured(1));
-    }
-    if (path.match(literal).hasMatch() && fixedPart.match(literal).hasMatch()) {
+    if (path.match(literal).hasMatch() && fixedPart.match(literal).hasMatch())
         result.append(literal);
-    }
     if (isSliceList(literal)) {
         const QStringList names = literal.split(QLatin1Char(':'));
-        for (const QString& name : names.mid(1)) {
-            if (!name.isEmpty()) {
+        for (const QString& name : names.mid(1))
+            if (!name.isEmpty())
                 result.append(QStringLiteral(":/") + names.first() + QLatin1Char('/') + name);
-            }
-        }
     }
     return result;
 }
@@ -77,9 +71,8 @@ bool PictureNames::exists(const QString& path, const QStringList& existing)
     if (path.contains(QLatin1Char('%'))) {
         static const QRegularExpression placeholder(QStringLiteral("%\\d+"));
         QStringList parts = path.split(placeholder);
-        for (QString& part : parts) {
+        for (QString& part : parts)
             part = QRegularExpression::escape(part);
-        }
         return existing.indexOf(QRegularExpression(
                    QRegularExpression::anchoredPattern(parts.join(QStringLiteral("[\\w-]+"))))) >= 0;
     }

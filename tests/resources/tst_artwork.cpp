@@ -44,18 +44,16 @@ QImage face(const QString& base)
 double leastContrast(const QImage& opaqueFace, int fromRow, int toRow, const QColor& ink)
 {
     double least = 21;
-    for (int y = fromRow; y <= toRow; ++y) {
+    for (int y = fromRow; y <= toRow; ++y)
         least = qMin(least, contrast(opaqueFace.pixelColor(opaqueFace.width() / 2, y), ink));
-    }
     return least;
 }
 
 QStringList picturesIn(const QString& folder, const QString& pattern)
 {
     QStringList names = QDir(folder).entryList({pattern}, QDir::Files);
-    for (QString& name : names) {
+    for (QString& name : names)
         name.prepend(folder + QLatin1Char('/'));
-    }
     return names;
 }
 
@@ -156,9 +154,8 @@ void tst_artwork::panelIconsAreLegible()
         for (const QString& state : BUTTON_STATES) {
             // A disabled icon lies on both disabled faces, a selected one on the selected ones.
             if (isDisabled(name) != isDisabled(state) ||
-                (!isDisabled(name) && isSelected != state.startsWith(QLatin1String("selected")))) {
+                (!isDisabled(name) && isSelected != state.startsWith(QLatin1String("selected"))))
                 continue;
-            }
             const double least = leastContrast(face(panelButton(state)), rect.top(), rect.bottom(), ink);
             QVERIFY2(least >= (isDisabled(name) ? DISABLED_CONTRAST : ENABLED_CONTRAST),
                      qPrintable(QStringLiteral("%1 on %2: %3").arg(name, state).arg(least)));
@@ -204,9 +201,8 @@ void tst_artwork::labelsAreLegible_data()
     for (const char* family : {"TextToolPanel_Buttons/Button_48", "TextToolPanel_Buttons/Button-38"}) {
         for (const QString& state : BUTTON_STATES) {
             QString name = QStringLiteral(":/") + QLatin1String(family);
-            if (name.endsWith(QLatin1String("38")) && state.startsWith(QLatin1Char('_'))) {
+            if (name.endsWith(QLatin1String("38")) && state.startsWith(QLatin1Char('_')))
                 name += QLatin1Char('B');
-            }
             name += state + QStringLiteral("_Center");
             QTest::newRow(qPrintable(name))
                 << name << (isDisabled(state) ? Tokens::TEXT_DISABLED : Tokens::TEXT)
@@ -276,13 +272,11 @@ void tst_artwork::signsAreLegible()
           ":/Picker/Picker_Allow_Dn_Rest", ":/FolderPicker/Titler_folder_icon",
           ":/FolderPicker/Picker_Icon_Enabel", ":/MainButtons/Main_Move_Handle"}) {
         const QColor ink = inkOf(QImage(QLatin1String(name)));
-        for (const QColor& ground : {Tokens::DIALOG, Tokens::FACE_TOP, Tokens::SELECTED_TOP}) {
+        for (const QColor& ground : {Tokens::DIALOG, Tokens::FACE_TOP, Tokens::SELECTED_TOP})
             QVERIFY2(contrast(ink, ground) >= ENABLED_CONTRAST, name);
-        }
     }
-    for (const char* name : {":/Views/Parts_011_Disabled", ":/Views/Parts_012_Disabled"}) {
+    for (const char* name : {":/Views/Parts_011_Disabled", ":/Views/Parts_012_Disabled"})
         QVERIFY2(contrast(inkOf(QImage(QLatin1String(name))), Tokens::DIALOG) >= DISABLED_CONTRAST, name);
-    }
     // An open row is told from a closed one, too.
     for (const char* state : {"Rest", "Pressed", "Disabled"}) {
         const QString name = QStringLiteral(":/Views/Parts_%1_%2");
@@ -401,18 +395,14 @@ void tst_artwork::rowPiecesFit_data()
     const auto row = [](const QString& base, const QStringList& names) {
         QTest::newRow(qPrintable(base + names.last())) << base << names;
     };
-    for (const QString& state : BUTTON_STATES) {
+    for (const QString& state : BUTTON_STATES)
         row(panelButton(state), ACROSS);
-    }
-    for (const char* state : {"B_Rest", "B_Pressed", "B_Disabled", "selected_Rest", "selected_Pressed"}) {
+    for (const char* state : {"B_Rest", "B_Pressed", "B_Disabled", "selected_Rest", "selected_Pressed"})
         row(QStringLiteral(":/TextToolPanel_Buttons/Button-38%1_").arg(QLatin1String(state)), ACROSS);
-    }
-    for (const char* state : {"_Pressed", "selected_Rest", "selected_Pressed"}) {
+    for (const char* state : {"_Pressed", "selected_Rest", "selected_Pressed"})
         row(QStringLiteral(":/ToolsBar_Buttons/Button_67%1_").arg(QLatin1String(state)), ACROSS);
-    }
-    for (const char* state : {"Rest", "Pressed", "Selected", "Disabled"}) {
+    for (const char* state : {"Rest", "Pressed", "Selected", "Disabled"})
         row(QStringLiteral(":/Pane_Tab/Tab_%1_").arg(QLatin1String(state)), ACROSS);
-    }
     for (const char* form : {"", "Disable_"}) {
         const QString base =
             QStringLiteral(":/TextToolPanel_TextBox/TextBox_Edittable_%1").arg(QLatin1String(form));
@@ -433,9 +423,8 @@ void tst_artwork::rowPiecesFit()
     const int last = QImage(base + names.at(2)).width();
     for (const Scaling scaling : SCALINGS) {
         for (const int width : {first.width() + last, first.width() + last + 1, 70, 257, 505, 1920}) {
-            if (width < first.width() + last) {
+            if (width < first.width() + last)
                 continue;
-            }
             const QImage image = threePieces(base, names, QSize(width, first.height()), scaling);
             // From the last column of the one end to the first of the other nothing changes.
             QVERIFY2(largestStepAcross(image, first.width() - 1, width - last) <= SEAM,
@@ -477,11 +466,10 @@ void tst_artwork::columnPiecesFit()
 void tst_artwork::framesFit_data()
 {
     QTest::addColumn<QString>("prefix");
-    for (const char* prefix : {":/PanelBG/Pane_1_", ":/PanelBG/Pane_2_", ":/PanelBG/Dialog_base_",
-                               ":/dialog_base/dialog_base_", ":/Dialog/dialog_base_", ":/Dialog/Dialog_base_",
-                               ":/ToolTip/Balloon_Common_", ":/Pane_Tab/Pane_"}) {
+    for (const char* prefix :
+         {":/PanelBG/Pane_1_", ":/PanelBG/Pane_2_", ":/PanelBG/Dialog_base_", ":/dialog_base/dialog_base_",
+          ":/Dialog/dialog_base_", ":/Dialog/Dialog_base_", ":/ToolTip/Balloon_Common_", ":/Pane_Tab/Pane_"})
         QTest::newRow(prefix) << QString::fromLatin1(prefix);
-    }
 }
 
 void tst_artwork::framesFit()
@@ -554,14 +542,12 @@ void tst_artwork::tabsJoinTheirPane()
     const QImage paneTop(QStringLiteral(":/Pane_Tab/Pane_Upper_Center"));
     const QRgb paneFace = QImage(QStringLiteral(":/Pane_Tab/Pane_Middle_Center")).pixel(0, 0);
     const QImage front(QStringLiteral(":/Pane_Tab/Tab_Selected_Center"));
-    for (int y = front.height() - Tokens::TAB_LINE; y < front.height(); ++y) {
+    for (int y = front.height() - Tokens::TAB_LINE; y < front.height(); ++y)
         QCOMPARE(front.pixel(0, y), paneFace);
-    }
     for (const char* state : {"Rest", "Pressed", "Disabled"}) {
         const QImage behind(QStringLiteral(":/Pane_Tab/Tab_%1_Center").arg(QLatin1String(state)));
-        for (int line = 0; line < Tokens::TAB_LINE; ++line) {
+        for (int line = 0; line < Tokens::TAB_LINE; ++line)
             QCOMPARE(behind.pixel(0, behind.height() - Tokens::TAB_LINE + line), paneTop.pixel(0, line));
-        }
     }
 }
 
@@ -570,12 +556,10 @@ void tst_artwork::stretchedPicturesAreFlat_data()
     QTest::addColumn<bool>("isAcross"); // the way it is stretched
     for (const char* name :
          {":/Separator_H", ":/Menu/Separator_H", ":/Views/Separator_H", ":/Pane_Tab/Separator_H",
-          ":/Menu/List_Cursor", ":/Views/List_Cursor", ":/Views/Header_Main_1", ":/Scrollbar/Scbar_base_h"}) {
+          ":/Menu/List_Cursor", ":/Views/List_Cursor", ":/Views/Header_Main_1", ":/Scrollbar/Scbar_base_h"})
         QTest::newRow(name) << true;
-    }
-    for (const char* name : {":/Separator_V", ":/Views/Separator_V", ":/Scrollbar/Scbar_base_v"}) {
+    for (const char* name : {":/Separator_V", ":/Views/Separator_V", ":/Scrollbar/Scbar_base_v"})
         QTest::newRow(name) << false;
-    }
 }
 
 void tst_artwork::stretchedPicturesAreFlat()

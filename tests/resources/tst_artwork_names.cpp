@@ -19,9 +19,8 @@ QStringList compiledPictures()
     QDirIterator files(QStringLiteral(":/"), QDir::Files, QDirIterator::Subdirectories);
     while (files.hasNext()) {
         const QString path = files.next();
-        if (!path.contains(QLatin1Char('.'))) { // what the libraries bring along has extensions
+        if (!path.contains(QLatin1Char('.'))) // what the libraries bring along has extensions
             names.append(path);
-        }
     }
     return names;
 }
@@ -49,15 +48,13 @@ QMultiMap<QString, QString> namedPictures()
                            QDirIterator::Subdirectories);
         while (files.hasNext()) {
             QFile file(files.next());
-            if (!file.open(QIODevice::ReadOnly)) {
+            if (!file.open(QIODevice::ReadOnly))
                 continue;
-            }
             const QStringList literals = PictureNames::literals(QString::fromUtf8(file.readAll()));
             for (const QString& literal : literals) {
                 const QStringList paths = PictureNames::paths(literal);
-                for (const QString& path : paths) {
+                for (const QString& path : paths)
                     names.insert(path, file.fileName());
-                }
             }
         }
     }
@@ -148,9 +145,8 @@ void tst_artwork_names::namesAreFoundInSource()
     QFETCH(const QStringList, paths);
     QStringList found;
     const QStringList literals = PictureNames::literals(source);
-    for (const QString& literal : literals) {
+    for (const QString& literal : literals)
         found += PictureNames::paths(literal);
-    }
     QCOMPARE(found, paths);
 }
 
@@ -162,12 +158,10 @@ void tst_artwork_names::commentsAreNoNames()
 void tst_artwork_names::missingNamesAreNoticed()
 {
     const QStringList existing{QStringLiteral(":/A/B_Left"), QStringLiteral(":/A/Icon-01")};
-    for (const char* path : {":/A/B_Left", ":/A/B_", ":/A/", ":/A/Icon-0%1", ":/A/%1_Left"}) {
+    for (const char* path : {":/A/B_Left", ":/A/B_", ":/A/", ":/A/Icon-0%1", ":/A/%1_Left"})
         QVERIFY2(PictureNames::exists(QLatin1String(path), existing), path);
-    }
-    for (const char* path : {":/A/B_Right", ":/A/B", ":/A/C_", ":/B/", ":/A/Icon-1%1", ":/A/%1_Right"}) {
+    for (const char* path : {":/A/B_Right", ":/A/B", ":/A/C_", ":/B/", ":/A/Icon-1%1", ":/A/%1_Right"})
         QVERIFY2(!PictureNames::exists(QLatin1String(path), existing), path);
-    }
 }
 
 void tst_artwork_names::namedPicturesExist()
@@ -176,11 +170,9 @@ void tst_artwork_names::namedPicturesExist()
     const QMultiMap<QString, QString> names = namedPictures();
     QVERIFY(names.size() > 0);
     QStringList missing;
-    for (auto name = names.begin(); name != names.end(); ++name) {
-        if (!PictureNames::exists(name.key(), existing) && !isCompleteFamily(name.key(), existing)) {
+    for (auto name = names.begin(); name != names.end(); ++name)
+        if (!PictureNames::exists(name.key(), existing) && !isCompleteFamily(name.key(), existing))
             missing.append(name.key() + QStringLiteral(" in ") + name.value());
-        }
-    }
     QVERIFY2(missing.isEmpty(), qPrintable(missing.join(QLatin1Char('\n'))));
 }
 
@@ -188,9 +180,8 @@ void tst_artwork_names::picturesAreReadable()
 {
     const QStringList existing = compiledPictures();
     QVERIFY(existing.size() > 0);
-    for (const QString& name : existing) {
+    for (const QString& name : existing)
         QVERIFY2(!QImage(name).isNull(), qPrintable(name));
-    }
 }
 
 void tst_artwork_names::framesAreComplete()
@@ -210,12 +201,10 @@ void tst_artwork_names::framesAreComplete()
                 const QString name = frame + rowName + QLatin1String(column);
                 const QSize size = QImage(name).size();
                 QVERIFY2(!size.isEmpty(), qPrintable(name));
-                if (row != ROWS[1]) {
+                if (row != ROWS[1])
                     QVERIFY2(size.height() == corner.height(), qPrintable(name));
-                }
-                if (column != COLUMNS[1]) {
+                if (column != COLUMNS[1])
                     QVERIFY2(size.width() == corner.width(), qPrintable(name));
-                }
             }
         }
     }
@@ -276,15 +265,13 @@ void tst_artwork_names::sizesAreThoseOfTheWidgets_data()
 static QStringList expanded(const QString& pattern)
 {
     const qsizetype close = pattern.indexOf(QLatin1Char('}'));
-    if (close < 0) {
+    if (close < 0)
         return {pattern};
-    }
     const qsizetype open = pattern.lastIndexOf(QLatin1Char('{'), close);
     QStringList result;
     const QStringList choices = pattern.mid(open + 1, close - open - 1).split(QLatin1Char('|'));
-    for (const QString& choice : choices) {
+    for (const QString& choice : choices)
         result += expanded(pattern.left(open) + choice + pattern.mid(close + 1));
-    }
     return result;
 }
 
@@ -307,9 +294,8 @@ void tst_artwork_names::canvasFrameSurroundsTheCanvas()
     const QPoint canvas = QPoint(609, 97) - QPoint(579, 75);
     // The checkers fill exactly the canvas, and a rim goes round it.
     QSet<QRgb> inside;
-    for (const QPoint& corner : {QPoint(0, 0), QPoint(1279, 0), QPoint(0, 719), QPoint(1279, 719)}) {
+    for (const QPoint& corner : {QPoint(0, 0), QPoint(1279, 0), QPoint(0, 719), QPoint(1279, 719)})
         inside.insert(frame.pixel(canvas + corner));
-    }
     QVERIFY(inside.size() <= 2);
     for (const QPoint& beside : {QPoint(-1, 0), QPoint(1280, 0), QPoint(0, -1), QPoint(0, 720)}) {
         QVERIFY(!inside.contains(frame.pixel(canvas + beside)));

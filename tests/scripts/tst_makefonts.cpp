@@ -26,9 +26,8 @@ void tst_makefonts::family_data()
     for (const char* name :
          {"KST", "KST Japanese Pro", "DFHeiW5-A", "YDGothic 100 Pro", "Nimbus Sans L", "Nimbus Roman No9 L",
           "Nimbus Mono L", "DejaVu Sans", "DejaVu Serif", "URW Bookman L", "URW Gothic L", "URW Chancery L",
-          "URW Palladio L", "IPAGothic", "IPAMincho", "IPAPGothic", "IPAPMincho"}) {
+          "URW Palladio L", "IPAGothic", "IPAMincho", "IPAPGothic", "IPAPMincho"})
         QTest::newRow(name) << QString::fromLatin1(name);
-    }
 }
 
 void tst_makefonts::family()

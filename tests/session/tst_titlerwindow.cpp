@@ -388,10 +388,9 @@ void tst_titlerwindow::focusCommandLeavesACleanStackClean()
         int id() const override { return 1; }
     };
     QAction* undo = nullptr;
-    for (QAction* action : mWindow->findChildren<QAction*>(QString(), Qt::FindDirectChildrenOnly)) {
+    for (QAction* action : mWindow->findChildren<QAction*>(QString(), Qt::FindDirectChildrenOnly))
         if (action->text().startsWith("Undo"))
             undo = action;
-    }
     QVERIFY(undo);
     mWindow->pushUndoStack(new Focus);
     QVERIFY(!undo->isEnabled());
@@ -406,10 +405,9 @@ void tst_titlerwindow::moveModeEatsPressesOutsideTheList()
     request(writeFolder("moving", {"t1"}));
     QVERIFY(QTest::qWaitForWindowExposed(mWindow, PATIENCE_MS));
     KSPushbutton* move = nullptr;
-    for (KSPushbutton* button : mWindow->findChildren<KSPushbutton*>()) {
+    for (KSPushbutton* button : mWindow->findChildren<KSPushbutton*>())
         if (button->text() == "Move")
             move = button;
-    }
     QVERIFY(move);
     QTest::mouseClick(move, Qt::LeftButton);
     QVERIFY(mWindow->archiveListIsMoveMode());
@@ -445,11 +443,10 @@ void tst_titlerwindow::masksGoWithTheWindow()
     const QString folder = writeFolder("masked", {"t1"});
     ShowMessageController* messages = ShowMessageController::getInstance();
     const auto isDark = [this] {
-        for (const QWidget* child : mWindow->findChildren<QWidget*>(QString(), Qt::FindDirectChildrenOnly)) {
+        for (const QWidget* child : mWindow->findChildren<QWidget*>(QString(), Qt::FindDirectChildrenOnly))
             if (child->geometry() == mWindow->rect() && child->autoFillBackground() && !child->isHidden() &&
                 child->palette().color(QPalette::Window).alpha() == 166)
                 return true;
-        }
         return false;
     };
     request(folder);

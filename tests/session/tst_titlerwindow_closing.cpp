@@ -477,10 +477,9 @@ void tst_titlerwindow_closing::choose(ArchiveAction::ARCHIVE_ACTION_TYPE type, i
 
 QAction* tst_titlerwindow_closing::undoAction() const
 {
-    for (QAction* action : mWindow->findChildren<QAction*>(QString(), Qt::FindDirectChildrenOnly)) {
+    for (QAction* action : mWindow->findChildren<QAction*>(QString(), Qt::FindDirectChildrenOnly))
         if (action->text().startsWith("Undo"))
             return action;
-    }
     return nullptr;
 }
 

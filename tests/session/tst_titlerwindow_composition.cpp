@@ -98,10 +98,9 @@ void tst_titlerwindow_composition::take(Road road)
 {
     switch (road) {
     case MoveMode:
-        for (KSPushbutton* button : mWindow->findChildren<KSPushbutton*>()) {
+        for (KSPushbutton* button : mWindow->findChildren<KSPushbutton*>())
             if (button->text() == TitlerWindow::tr("Move"))
                 button->click();
-        }
         QVERIFY(mWindow->archiveListIsMoveMode());
         break;
     case OtherTitle:

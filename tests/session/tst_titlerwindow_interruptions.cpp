@@ -75,10 +75,9 @@ void tst_titlerwindow_interruptions::initTestCase()
     QTRY_COMPARE(list->count(), 12);
     QTRY_VERIFY(list->archiveItem(11)->hasChildWidgets());
     // A tap is seen, but opens no dialog and closes no window.
-    for (QAbstractButton* button : mWindow->findChildren<QAbstractButton*>()) {
+    for (QAbstractButton* button : mWindow->findChildren<QAbstractButton*>())
         if (!qobject_cast<KSBaseItemWidget*>(button))
             disconnect(button, &QAbstractButton::clicked, nullptr, nullptr);
-    }
 }
 
 void tst_titlerwindow_interruptions::cleanupTestCase()
@@ -94,10 +93,9 @@ void tst_titlerwindow_interruptions::closeDialogs()
 {
     mWindow->findChild<FolderPicker*>()->hide(); // closing it would end the session
     mWindow->findChild<TemplatePicker*>()->hide();
-    for (QWidget* window : QApplication::topLevelWidgets()) {
+    for (QWidget* window : QApplication::topLevelWidgets())
         if (window != mWindow && window->isVisible())
             window->close();
-    }
     QCoreApplication::processEvents();
 }
 
@@ -195,9 +193,8 @@ void tst_titlerwindow_interruptions::everyClassIsThere()
     const QString names = mNames.join(QLatin1Char('\n'));
     for (const char* part : {"ArchiveItem", "movable", "GraphicsView", "ToolsBar", "TextToolsPanel",
                              "KSTreeView", "KSTreeHeaderView", "FolderEditor", "TemplateItem", "KSTabBar",
-                             "ColorPalette", "ColorButton", "ArchiveMenu", "FontCombox", "KSRadiobutton"}) {
+                             "ColorPalette", "ColorButton", "ArchiveMenu", "FontCombox", "KSRadiobutton"})
         QVERIFY2(names.contains(QLatin1String(part)), qPrintable(QLatin1String(part) + "\n" + names));
-    }
 }
 
 int main(int argc, char** argv)

@@ -191,10 +191,9 @@ QPoint tst_titlerwindow_palette::centerOf(int id) const
 
 QAction* tst_titlerwindow_palette::undoAction() const
 {
-    for (QAction* action : mWindow->findChildren<QAction*>(QString(), Qt::FindDirectChildrenOnly)) {
+    for (QAction* action : mWindow->findChildren<QAction*>(QString(), Qt::FindDirectChildrenOnly))
         if (action->text().startsWith(QLatin1String("Undo")))
             return action;
-    }
     return nullptr;
 }
 
@@ -213,10 +212,9 @@ QStringList tst_titlerwindow_palette::colorsOf(const TText& text)
 QStringList tst_titlerwindow_palette::colorsOnCanvas() const
 {
     QStringList colors;
-    for (const int id : {1, 2}) {
+    for (const int id : {1, 2})
         if (const GraphicsText* item = scene()->findTextItem(id))
             colors += colorsOf(*item->getItemTText());
-    }
     return colors;
 }
 
@@ -227,10 +225,9 @@ QStringList tst_titlerwindow_palette::colorsOnDisk() const
     if (!ArchiveController().getOneArchive(mFolder + "/a.xml", &archive))
         return {QStringLiteral("unreadable")};
     for (const int id : {1, 2}) {
-        for (const TText* text : archive.text()) {
+        for (const TText* text : archive.text())
             if (text->getTextObjectID() == id)
                 colors += colorsOf(*text);
-        }
     }
     return colors;
 }
@@ -338,10 +335,9 @@ void tst_titlerwindow_palette::happen(Event event, const QString& button)
         find<QAbstractButton>("PaletteCancel")->click();
         break;
     case MoveMode:
-        for (QPushButton* each : mWindow->findChildren<QPushButton*>()) {
+        for (QPushButton* each : mWindow->findChildren<QPushButton*>())
             if (each->text() == TitlerWindow::tr("Move"))
                 each->click();
-        }
         QVERIFY(mWindow->archiveListIsMoveMode());
         break;
     case Hidden:
@@ -419,10 +415,9 @@ void tst_titlerwindow_palette::sliderIsCommittedFirst()
     Archive archive;
     QVERIFY(ArchiveController().getOneArchive(mFolder + "/a.xml", &archive));
     for (const TText* text : archive.text()) {
-        for (const TextStyle* style : text->textItems()) {
+        for (const TextStyle* style : text->textItems())
             if (text->getTextObjectID() == 1)
                 QCOMPARE(style->textEdge().getEdgeWidth(), 9);
-        }
     }
 }
 

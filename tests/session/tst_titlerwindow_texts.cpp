@@ -238,10 +238,9 @@ void tst_titlerwindow_texts::tapPanel(const char* name)
 QAction* tst_titlerwindow_texts::action(const QString& name) const
 {
     const auto actions = mWindow->findChildren<QAction*>(QString(), Qt::FindDirectChildrenOnly);
-    for (QAction* found : actions) {
+    for (QAction* found : actions)
         if (found->text().startsWith(name))
             return found;
-    }
     return nullptr;
 }
 
@@ -265,10 +264,9 @@ void tst_titlerwindow_texts::take(Road road)
         break;
     }
     case MoveMode:
-        for (KSPushbutton* button : mWindow->findChildren<KSPushbutton*>()) {
+        for (KSPushbutton* button : mWindow->findChildren<KSPushbutton*>())
             if (button->text() == TitlerWindow::tr("Move"))
                 button->click();
-        }
         QVERIFY(mWindow->archiveListIsMoveMode());
         mWindow->slotChangeDoneToMoveMode();
         break;
@@ -306,10 +304,9 @@ QStringList tst_titlerwindow_texts::textsInFile(const QString& stem) const
         return {QStringLiteral("no file")};
     QStringList texts;
     QXmlStreamReader reader(&file);
-    while (!reader.atEnd()) {
+    while (!reader.atEnd())
         if (reader.readNext() == QXmlStreamReader::StartElement && reader.name() == QLatin1String("content"))
             texts.append(reader.attributes().value(QLatin1String("text")).toString());
-    }
     return texts;
 }
 

@@ -216,10 +216,9 @@ void tst_titlerwindow_wiring::list()
     ROW(mWindow, TitlerWindow::moveButtonClicked, mList, ArchiveList::moveButtonClicked);
     KSPushbutton* moveButton = nullptr;
     const auto buttons = mWindow->findChildren<KSPushbutton*>();
-    for (KSPushbutton* button : buttons) {
+    for (KSPushbutton* button : buttons)
         if (button->text() == mWindow->tr("Move"))
             moveButton = button;
-    }
     QVERIFY(moveButton);
     ROW(moveButton, QPushButton::clicked, mWindow, TitlerWindow::hideSoftWareWithDeleteEmptyItems);
     ROW(moveButton, QPushButton::clicked, mWindow, TitlerWindow::editAndDoneButtonClicked);

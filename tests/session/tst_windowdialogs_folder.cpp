@@ -86,10 +86,9 @@ private:
     }
     bool isMasked(const QWidget* owner) const
     {
-        for (const QWidget* child : owner->findChildren<QWidget*>(Qt::FindDirectChildrenOnly)) {
+        for (const QWidget* child : owner->findChildren<QWidget*>(Qt::FindDirectChildrenOnly))
             if (child->isVisible() && child->palette().color(QPalette::Window) == QColor(0, 0, 0, 166))
                 return true;
-        }
         return false;
     }
     FolderPicker* picker() const { return mWindow->findChild<FolderPicker*>(); }

@@ -140,10 +140,9 @@ void tst_windowdialogs_template::whenOpen(std::function<void()> action)
 // The one dark child that is no mask for messages: those do not exist before their first use.
 QWidget* tst_windowdialogs_template::opacityMask() const
 {
-    for (QWidget* child : mWindow->findChildren<QWidget*>(QString(), Qt::FindDirectChildrenOnly)) {
+    for (QWidget* child : mWindow->findChildren<QWidget*>(QString(), Qt::FindDirectChildrenOnly))
         if (child->size() == mWindow->size() && child->autoFillBackground() && !child->isWindow())
             return child;
-    }
     return nullptr;
 }
 

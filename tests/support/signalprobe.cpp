@@ -47,17 +47,15 @@ void wrongCallback()
 int waitForSignals()
 {
     say("ready");
-    while (true) {
+    while (true)
         pause();
-    }
 }
 
 int runEventLoop(int argc, char** argv, bool twice)
 {
     QCoreApplication application(argc, argv);
-    if (twice) {
+    if (twice)
         registerSystemSignalHandler(wrongCallback, "first");
-    }
     registerSystemSignalHandler(quitFromEventLoop, "probe");
     QTimer::singleShot(0, &application, [] { say("ready"); });
     const int result = QCoreApplication::exec();
@@ -68,13 +66,11 @@ int runEventLoop(int argc, char** argv, bool twice)
 int surviveTheHarmless()
 {
     registerSystemSignalHandler(nullptr, nullptr);
-    for (const int number : {SIGALRM, SIGPIPE, SIGPWR, SIGUSR1, SIGUSR2, SIGTERM, SIGINT}) {
+    for (const int number : {SIGALRM, SIGPIPE, SIGPWR, SIGUSR1, SIGUSR2, SIGTERM, SIGINT})
         raise(number);
-    }
     int ends[2];
-    if (socketpair(AF_UNIX, SOCK_STREAM, 0, ends) != 0) {
+    if (socketpair(AF_UNIX, SOCK_STREAM, 0, ends) != 0)
         return 1;
-    }
     close(ends[1]);
     const bool failed = write(ends[0], "x", 1) == -1; // raises SIGPIPE
     say(failed ? "alive" : "written");
@@ -143,36 +139,27 @@ int endInThreadBy(void (*end)())
 int main(int argc, char** argv)
 {
     const char* mode = argc > 1 ? argv[1] : "";
-    if (std::strcmp(mode, "loop") == 0) {
+    if (std::strcmp(mode, "loop") == 0)
         return runEventLoop(argc, argv, false);
-    }
-    if (std::strcmp(mode, "twice") == 0) {
+    if (std::strcmp(mode, "twice") == 0)
         return runEventLoop(argc, argv, true);
-    }
     if (std::strcmp(mode, "plain") == 0) {
         registerSystemSignalHandler(endAtOnce, "probe");
         return waitForSignals();
     }
-    if (std::strcmp(mode, "harmless") == 0) {
+    if (std::strcmp(mode, "harmless") == 0)
         return surviveTheHarmless();
-    }
-    if (std::strcmp(mode, "again") == 0) {
+    if (std::strcmp(mode, "again") == 0)
         return faultAfterFault();
-    }
-    if (std::strcmp(mode, "abort") == 0) {
+    if (std::strcmp(mode, "abort") == 0)
         return endBy(giveUp);
-    }
-    if (std::strcmp(mode, "abort-thread") == 0) {
+    if (std::strcmp(mode, "abort-thread") == 0)
         return endInThreadBy(giveUp);
-    }
-    if (std::strcmp(mode, "fault") == 0) {
+    if (std::strcmp(mode, "fault") == 0)
         return endBy(fault);
-    }
-    if (std::strcmp(mode, "overflow") == 0) {
+    if (std::strcmp(mode, "overflow") == 0)
         return endBy(fillOwnStack);
-    }
-    if (std::strcmp(mode, "overflow-thread") == 0) {
+    if (std::strcmp(mode, "overflow-thread") == 0)
         return endInThreadBy(fillOwnStack);
-    }
     return 2;
 }

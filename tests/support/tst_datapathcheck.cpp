@@ -59,9 +59,8 @@ void tst_datapathcheck::goodPaths()
 void tst_datapathcheck::longPaths_data()
 {
     QTest::addColumn<int>("length");
-    for (const int length : {100, 127, 128, 4095, 4096, 100000}) {
+    for (const int length : {100, 127, 128, 4095, 4096, 100000})
         QTest::addRow("%d", length) << length;
-    }
 }
 
 void tst_datapathcheck::longPaths()
@@ -75,9 +74,8 @@ void tst_datapathcheck::longPaths()
 void tst_datapathcheck::relativePaths_data()
 {
     QTest::addColumn<QByteArray>("path");
-    for (const char* path : {"data", "./data", "../data", "~/data", "."}) {
+    for (const char* path : {"data", "./data", "../data", "~/data", "."})
         QTest::addRow("%s", path) << QByteArray(path);
-    }
 }
 
 void tst_datapathcheck::relativePaths()
@@ -105,9 +103,8 @@ void tst_datapathcheck::noFolderCanBeMade()
 
 void tst_datapathcheck::noFileCanBeMade()
 {
-    if (geteuid() == 0) {
+    if (geteuid() == 0)
         QSKIP("root may write everywhere");
-    }
     const QString user = mFolder.filePath("closed/defaultuser");
     QVERIFY(QDir().mkpath(user));
     QVERIFY(QFile::setPermissions(user, QFile::ReadOwner | QFile::ExeOwner));

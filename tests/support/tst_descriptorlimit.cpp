@@ -42,9 +42,8 @@ void tst_descriptorlimit::keepsAHigherOne()
 {
     rlimit limit{};
     getrlimit(RLIMIT_NOFILE, &limit);
-    if (limit.rlim_max <= DescriptorLimit::WANTED) {
+    if (limit.rlim_max <= DescriptorLimit::WANTED)
         QSKIP("the hard limit of this machine is too low");
-    }
     setSoft(DescriptorLimit::WANTED + 1);
     QCOMPARE(raised().rlim_cur, rlim_t(DescriptorLimit::WANTED + 1));
 }

@@ -32,9 +32,8 @@ private Q_SLOTS:
 void tst_k2sys::init()
 {
     for (const char* name : {"K2SYS_AC_ROOT", "K2SYS_AC_DATA", "K2SYS_AC_PREFIX", "K2SYS_LOG_DIR",
-                             "K2SYS_PORT_OFFSET", "K2SYS_FS_REMAIN", "XDG_DATA_HOME", "TZ"}) {
+                             "K2SYS_PORT_OFFSET", "K2SYS_FS_REMAIN", "XDG_DATA_HOME", "TZ"})
         qunsetenv(name);
-    }
 }
 
 void tst_k2sys::root()
@@ -123,9 +122,8 @@ void tst_k2sys::portOffset()
 {
     QFETCH(QByteArray, value);
     QFETCH(int, offset);
-    if (!value.isEmpty()) {
+    if (!value.isEmpty())
         qputenv("K2SYS_PORT_OFFSET", value);
-    }
     QCOMPARE(k2sys_port_offset(), offset);
 }
 

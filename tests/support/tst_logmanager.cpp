@@ -26,9 +26,8 @@ namespace
 QStringList linesOf(const QString& path)
 {
     QFile file(path);
-    if (!file.open(QIODevice::ReadOnly)) {
+    if (!file.open(QIODevice::ReadOnly))
         return {};
-    }
     QStringList lines = QString::fromUtf8(file.readAll()).split('\n');
     lines.removeLast();
     return lines;

@@ -35,9 +35,8 @@ void tst_systemsignalhandler::start(QProcess& process, const QString& mode)
 QByteArray tst_systemsignalhandler::readUntil(QProcess& process, const QByteArray& text)
 {
     QByteArray output;
-    while (!output.contains(text) && process.waitForReadyRead(20000)) {
+    while (!output.contains(text) && process.waitForReadyRead(20000))
         output += process.readAllStandardOutput();
-    }
     return output;
 }
 

@@ -130,9 +130,8 @@ inline void InputContextFixture::init()
     m_item = new FakeTextItem(m_parentItem);
     m_item->setTextInteractionFlags(Qt::TextEditorInteraction);
     m_view = new QGraphicsView(m_scene);
-    for (QWidget* widget : QList<QWidget*>{m_button, m_edit, m_other, m_box, m_view}) {
+    for (QWidget* widget : QList<QWidget*>{m_button, m_edit, m_other, m_box, m_view})
         layout->addWidget(widget);
-    }
     m_window->show();
     m_window->activateWindow();
     QVERIFY(QTest::qWaitForWindowActive(m_window.get(), PATIENCE_MS));
@@ -163,7 +162,6 @@ inline void InputContextFixture::open(QWidget* widget)
 // Types on the physical keyboard.
 inline void InputContextFixture::type(const char* letters)
 {
-    for (; *letters != '\0'; ++letters) {
+    for (; *letters != '\0'; ++letters)
         QTest::keyClick(m_window->windowHandle(), *letters);
-    }
 }

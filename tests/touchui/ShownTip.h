@@ -7,10 +7,8 @@
 inline QWidget* shownTip()
 {
     const QWidgetList windows = QApplication::topLevelWidgets();
-    for (QWidget* window : windows) {
-        if (window->objectName() == QStringLiteral("KSToolTip") && window->isVisible()) {
+    for (QWidget* window : windows)
+        if (window->objectName() == QStringLiteral("KSToolTip") && window->isVisible())
             return window;
-        }
-    }
     return nullptr;
 }

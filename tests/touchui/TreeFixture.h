@@ -45,9 +45,8 @@ public:
         for (int i = 0; i < folders; ++i) {
             SourceNode* folder =
                 add(QStringLiteral("Folder %1").arg(i, 3, 10, QLatin1Char('0')), nullptr, true);
-            for (int j = 0; j < files; ++j) {
+            for (int j = 0; j < files; ++j)
                 add(QStringLiteral("Title %1").arg(j), folder, false);
-            }
         }
     }
 

@@ -42,9 +42,8 @@ void TreeViewFixture::touchTap(const QPoint& point)
 void TreeViewFixture::swipe(const QPoint& from, int distance, int steps)
 {
     QTest::touchEvent(m_area, m_device).press(0, from, m_area);
-    for (int step = 1; step <= steps; ++step) {
+    for (int step = 1; step <= steps; ++step)
         QTest::touchEvent(m_area, m_device).move(0, from + QPoint(0, distance * step / steps), m_area);
-    }
     QTest::touchEvent(m_area, m_device).release(0, from + QPoint(0, distance), m_area);
 }
 

@@ -42,12 +42,11 @@ void tst_dialogmasks::touchesReachTheOwnerWithoutMasks()
 {
     QFETCH(QString, steps);
     DialogMasks both(mOwner.get());
-    for (const QChar step : steps) {
+    for (const QChar step : steps)
         if (step.toUpper() == QLatin1Char('D'))
             both.showDialogMaskWidget(step.isUpper());
         else
             both.showMessageMaskWidget(step.isUpper());
-    }
     QTEST(takesTouches(), "takesTouches");
 }
 

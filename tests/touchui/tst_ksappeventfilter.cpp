@@ -172,21 +172,18 @@ void tst_ksappeventfilter::clusterTakesFive()
     QObject objects[6];
     QObject stranger;
     QCOMPARE(lock->tryLock(&stranger, LOCKMETHOD_TOUCH, nullptr), -1);
-    for (QObject& object : objects) {
+    for (QObject& object : objects)
         lock->registerObj(&object);
-    }
-    for (int i = 0; i < 5; ++i) {
+    for (int i = 0; i < 5; ++i)
         QCOMPARE(lock->tryLock(&objects[i], LOCKMETHOD_TOUCH, nullptr), 0);
-    }
     QCOMPARE(lock->tryLock(&objects[5], LOCKMETHOD_TOUCH, nullptr), -1);
     QVERIFY(!lock->isLockedObj(&objects[5], LOCKMETHOD_TOUCH));
     QCOMPARE(lock->tryUnlock(&stranger, LOCKMETHOD_TOUCH), -1);
     QCOMPARE(lock->tryUnlock(&objects[0], LOCKMETHOD_TOUCH), 0);
     QVERIFY(lock->isLocked());
     QCOMPARE(lock->tryLock(&objects[5], LOCKMETHOD_TOUCH, nullptr), 0);
-    for (int i = 1; i < 6; ++i) {
+    for (int i = 1; i < 6; ++i)
         QCOMPARE(lock->tryUnlock(&objects[i], LOCKMETHOD_TOUCH), 0);
-    }
     QVERIFY(!lock->isLocked());
 }
 
@@ -378,17 +375,15 @@ void tst_ksappeventfilter::sixthObjectOfAClusterIsSwallowed()
 {
     EventCounter objects[6];
     QList<QObject*> all;
-    for (EventCounter& object : objects) {
+    for (EventCounter& object : objects)
         all.append(&object);
-    }
     KSLockObject* cluster = m_filter->registerLockObject(all, nullptr, LOCKOBJECT_CLUSTER, nullptr);
     const auto send = [this](QObject* object, QEvent::Type type) {
         QTouchEvent event(type, m_device);
         return QCoreApplication::sendEvent(object, &event);
     };
-    for (EventCounter& object : objects) {
+    for (EventCounter& object : objects)
         send(&object, QEvent::TouchBegin);
-    }
     QCOMPARE(m_filter->activateLockObjects().value(cluster).size(), 5);
     QCOMPARE(objects[4].types, QList<int>{QEvent::TouchBegin});
     QVERIFY(objects[5].types.isEmpty());
@@ -517,9 +512,8 @@ void tst_ksappeventfilter::whatEndsATouchCancelsItAtItsHolder()
     QVERIFY(m_first->isDown());
     end();
     QVERIFY(!m_first->isDown());
-    for (const QList<QObject*>& holders : m_filter->activateLockObjects()) {
+    for (const QList<QObject*>& holders : m_filter->activateLockObjects())
         QVERIFY(holders.isEmpty());
-    }
     // Whatever it was is over; the finger is still there.
     m_filter->unlock();
     m_dialog.reset();

@@ -59,9 +59,8 @@ private:
     void fill(int count)
     {
         m_box->clear();
-        for (int i = 0; i < count; ++i) {
+        for (int i = 0; i < count; ++i)
             m_box->addItem(QStringLiteral("Row %1").arg(i));
-        }
     }
     void open()
     {

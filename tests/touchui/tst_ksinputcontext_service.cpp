@@ -166,9 +166,8 @@ void tst_ksinputcontext_service::keysOfOtherTypesAreDropped()
     open(m_edit);
     m_edit->setText(QStringLiteral("a"));
     // Another process may send any number.
-    for (const int type : {-1, 0, 2, 3, 5, 12, 52, 194, 199, 65536, 0x7fffffff}) {
+    for (const int type : {-1, 0, 2, 3, 5, 12, 52, 194, 199, 65536, 0x7fffffff})
         m_context->sendKey(keyRecord(type, Qt::Key_B, L"b"));
-    }
     QCOMPARE(m_edit->text(), QStringLiteral("a"));
     QVERIFY(!KSInputContext::isSoftKeyboardClosed());
     m_context->sendKey(keyRecord(QEvent::KeyPress, -5, L"b"));
@@ -389,11 +388,10 @@ void tst_ksinputcontext_service::focusManagerWithoutAServer()
     qputenv("DISPLAY", ":4711");
     QCOMPARE(KSInputFocusManager::getInputFocusWindow(), 0UL);
     KSInputFocusManager::setInputFocusWindow(1);
-    if (display.isNull()) {
+    if (display.isNull())
         qunsetenv("DISPLAY");
-    } else {
+    else
         qputenv("DISPLAY", display);
-    }
 }
 
 void tst_ksinputcontext_service::typedTextIsLogged()

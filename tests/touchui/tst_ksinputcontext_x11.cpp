@@ -42,9 +42,8 @@ namespace
 bool addKeys(const QList<KeySym>& wanted)
 {
     Display* display = XOpenDisplay(nullptr);
-    if (display == nullptr) {
+    if (display == nullptr)
         return false;
-    }
     int lowest = 0;
     int highest = 0;
     XDisplayKeycodes(display, &lowest, &highest);
@@ -95,9 +94,8 @@ void tst_ksinputcontext_x11::initTestCase()
     QCOMPARE(QGuiApplication::platformName(), QStringLiteral("xcb"));
     constexpr KeySym UNICODE = 0x1000000;
     QList<KeySym> symbols{XK_dead_acute};
-    for (const QChar letter : QStringLiteral("速報속보")) {
+    for (const QChar letter : QStringLiteral("速報속보"))
         symbols.append(UNICODE + letter.unicode());
-    }
     QVERIFY(addKeys(symbols));
     qApp->setObjectName(QStringLiteral("Titler"));
     qApp->installEventFilter(&m_filter);
@@ -153,9 +151,8 @@ void tst_ksinputcontext_x11::eachKeyIsForwardedOnce()
     press({QStringLiteral("type"), QStringLiteral("速報 속보")});
     QTRY_COMPARE(m_edit->text(), QStringLiteral("速報 속보"));
     QString forwarded;
-    for (const tagSoftKeyBoardKeyData& key : std::as_const(m_service.keys)) {
+    for (const tagSoftKeyBoardKeyData& key : std::as_const(m_service.keys))
         forwarded += QString::fromStdWString(key.text);
-    }
     QCOMPARE(forwarded, QStringLiteral("速報 속보"));
     press({QStringLiteral("key"), QStringLiteral("BackSpace")});
     QTRY_COMPARE(m_edit->text(), QStringLiteral("速報 속"));
@@ -229,9 +226,8 @@ int main(int argc, char** argv)
     windowManager.start(QStringLiteral("openbox"),
                         {QStringLiteral("--sm-disable"), QStringLiteral("--startup"),
                          QStringLiteral("touch \"%1\"").arg(started)});
-    for (const QDeadlineTimer limit(20000); !QFile::exists(started) && !limit.hasExpired();) {
+    for (const QDeadlineTimer limit(20000); !QFile::exists(started) && !limit.hasExpired();)
         QThread::msleep(10);
-    }
     KSInputContext::install();
     QApplication app(argc, argv);
     tst_ksinputcontext_x11 test;

@@ -54,9 +54,8 @@ private:
 QStringList tst_kstreemodel::names(const KSTreeModel& model, const QModelIndex& parent)
 {
     QStringList list;
-    for (int row = 0; row < model.rowCount(parent); ++row) {
+    for (int row = 0; row < model.rowCount(parent); ++row)
         list.append(model.index(row, 0, parent).data().toString());
-    }
     return list;
 }
 
@@ -87,9 +86,8 @@ void tst_kstreemodel::attributeColumnsCanBeInsertedAndRemoved()
 {
     KSModelTreeDataItem item;
     item.setAttributeMaxKey(Qt::DisplayRole, 2);
-    for (int column = 0; column < 3; ++column) {
+    for (int column = 0; column < 3; ++column)
         item.setAttribute(Qt::DisplayRole, column, column);
-    }
     item.setAttribute(KSVIEW::ItemEnableRole, true, 0);
     item.insertAttributeColumns(1, 2);
     QCOMPARE(item.getAttributeMaxKey(Qt::DisplayRole), 4);
@@ -360,9 +358,8 @@ void tst_kstreemodel::moveRowsKeepsPersistentIndices()
     QFETCH(bool, moved);
     QFETCH(QString, result);
     TreeSource source;
-    for (const char* name : {"A", "B", "C", "D"}) {
+    for (const char* name : {"A", "B", "C", "D"})
         source.add(QLatin1String(name), nullptr, true);
-    }
     KSTreeModel model(&source, 3);
     const QPersistentModelIndex watched = model.index(from, 0);
     const QString name = watched.data().toString();
@@ -513,9 +510,8 @@ void tst_kstreemodel::sortHelperRefuses()
 void tst_kstreemodel::filesComeBeforeFolders()
 {
     TreeSource source;
-    for (const char* name : {"F2", "f2", "F1", "f1", "F3"}) {
+    for (const char* name : {"F2", "f2", "F1", "f1", "F3"})
         source.add(QLatin1String(name), nullptr, *name == 'F');
-    }
     KSTreeModel model(&source, 3);
     model.createDataItems();
     model.sort(0, Qt::DescendingOrder);
@@ -626,9 +622,8 @@ void tst_kstreemodel::randomOperations()
             model.setData(model.index(below(rows), 1, parent), step, KSVIEW::ItemSizeRole);
         }
         QCOMPARE(watched.isValid(), kept && rows > 0);
-        if (watched.isValid()) {
+        if (watched.isValid())
             QCOMPARE(watched.sibling(watched.row(), 0).data().toString(), name);
-        }
     }
 }
 

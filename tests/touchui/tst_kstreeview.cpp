@@ -395,9 +395,8 @@ void tst_kstreeview::flickStepIsAtLeastAPixel()
 {
     m_tree->setStartPoint(QPoint(0, 0));
     m_tree->setEndPoint(QPoint(0, -4));
-    for (int y = -4; y < 0; ++y) {
+    for (int y = -4; y < 0; ++y)
         QCOMPARE(m_tree->getFlickDistance().y(), y / 2);
-    }
 }
 
 void tst_kstreeview::tapOnTheHeaderSorts()

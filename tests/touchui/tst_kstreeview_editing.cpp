@@ -113,9 +113,8 @@ void tst_kstreeview_editing::rowVanishesUnderTheEditor()
     QPointer<QLineEdit> editor = m_tree->findChild<QLineEdit*>();
     m_model->removeRow(2);
     QVERIFY(!m_tree->getRenameIndex().isValid());
-    if (editor != nullptr) {
+    if (editor != nullptr)
         m_tree->closeEditorState(editor, QAbstractItemDelegate::NoHint);
-    }
     QCOMPARE(m_model->index(2, 0).data().toString(), QStringLiteral("Folder 003"));
 }
 
@@ -298,9 +297,8 @@ void tst_kstreeview_editing::paintsUnderAWindowStyleSheet()
     QApplication::processEvents();
     const QImage styled = shot();
     // The rule under the header and the rows, the header's ground, the folder icon.
-    for (const QPoint& point : {QPoint(790, 20), QPoint(700, 44 + ROW - 1), QPoint(54, 44 + ROW / 2)}) {
+    for (const QPoint& point : {QPoint(790, 20), QPoint(700, 44 + ROW - 1), QPoint(54, 44 + ROW / 2)})
         QCOMPARE(styled.pixelColor(point), plain.pixelColor(point));
-    }
 }
 
 void tst_kstreeview_editing::operationFocusSurroundsTheEditedRow()

@@ -69,9 +69,8 @@ void tst_nineslice::cellsTile_data()
 {
     QTest::addColumn<QSize>("size");
     for (const QSize& size :
-         {QSize(1, 1), QSize(7, 3), QSize(32, 32), QSize(33, 200), QSize(501, 17), QSize(1920, 1080)}) {
+         {QSize(1, 1), QSize(7, 3), QSize(32, 32), QSize(33, 200), QSize(501, 17), QSize(1920, 1080)})
         QTest::addRow("%dx%d", size.width(), size.height()) << size;
-    }
 }
 
 void tst_nineslice::cellsTile()
@@ -122,11 +121,9 @@ void tst_nineslice::framePaintsEveryPixelAtEverySize()
         QPainter painter(&image);
         frame.paint(painter, image.rect());
         painter.end();
-        for (int y = 0; y < size.height(); ++y) {
-            for (int x = 0; x < size.width(); ++x) {
+        for (int y = 0; y < size.height(); ++y)
+            for (int x = 0; x < size.width(); ++x)
                 QCOMPARE(image.pixelColor(x, y).alpha(), 255);
-            }
-        }
         QCOMPARE(image.pixelColor(0, 0), QColor(0, 200, 255));
         QCOMPARE(image.pixelColor(size.width() - 1, size.height() - 1), QColor(160, 200, 95));
     }
