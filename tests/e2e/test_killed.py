@@ -7,7 +7,7 @@ import harness
 import wire
 from mortal import MortalTitler
 
-KILLS = int(os.environ.get("TITLER_KILLS", "25"))
+KILLS = int(os.environ.get("TITLER_KILLS", "10"))
 
 
 class Killed(MortalTitler, harness.TitlerTest):
