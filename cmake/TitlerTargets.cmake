@@ -90,7 +90,7 @@ file(MAKE_DIRECTORY ${TITLER_TEST_DIR}/xdg/runtime)
 file(CHMOD ${TITLER_TEST_DIR}/xdg/runtime PERMISSIONS OWNER_READ OWNER_WRITE OWNER_EXECUTE)
 set(TITLER_TEST_ENVIRONMENT
     LC_ALL=C.UTF-8
-    QTEST_FUNCTION_TIMEOUT=1200000
+    QTEST_FUNCTION_TIMEOUT=2400000
     HOME=${TITLER_TEST_DIR}/home
     XDG_DATA_HOME=${TITLER_TEST_DIR}/xdg/data
     XDG_CONFIG_HOME=${TITLER_TEST_DIR}/xdg/config
@@ -104,7 +104,15 @@ set(TITLER_TEST_ENVIRONMENT
 
 # The time limit of a test ends what hangs. Most need seconds of it, so that a machine with much other work does not end
 # what is only slow.
-set(TITLER_TEST_SECONDS 600)
+set(TITLER_TEST_SECONDS 1200)
+# The temporary files of most tests are in memory where there is room for them: while other programs sync, each rename on
+# the disk can take seconds. Tests of the whole programs work on the disk.
+set(TITLER_TEST_MEMORY "")
+execute_process(COMMAND df --output=avail -BG /dev/shm OUTPUT_VARIABLE room ERROR_QUIET)
+if(room MATCHES "([0-9]+)G" AND CMAKE_MATCH_1 GREATER_EQUAL 4)
+    set(TITLER_TEST_MEMORY TMPDIR=/dev/shm)
+endif()
+
 # Tests with a long form that takes hours end what hangs themselves.
 set(TITLER_LONG_FORM_SECONDS 100000)
 
@@ -135,5 +143,5 @@ function(titler_add_test name)
     titler_precompile_later(${name})
     add_dependencies(${name} titler_fonts)
     add_test(NAME ${name} COMMAND ${name})
-    titler_set_test(${name} ${TITLER_TEST_SECONDS} QT_QPA_PLATFORM=offscreen)
+    titler_set_test(${name} ${TITLER_TEST_SECONDS} QT_QPA_PLATFORM=offscreen ${TITLER_TEST_MEMORY})
 endfunction()

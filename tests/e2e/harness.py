@@ -24,6 +24,7 @@ HERE = os.path.dirname(os.path.abspath(__file__))
 sys.path.insert(0, os.path.join(os.path.dirname(os.path.dirname(HERE)), "scripts"))
 sys.path.insert(0, os.path.dirname(HERE))
 
+import samples  # noqa: E402  pylint: disable=wrong-import-position
 import session  # noqa: E402  pylint: disable=wrong-import-position
 
 BUILD = os.environ.get("TITLER_BUILD", os.path.join(session.ROOT, "build"))
@@ -193,33 +194,18 @@ class TitlerTest(unittest.TestCase):
         self.start_programs()
 
     def provision(self):
-        """Copies the sample data, which the first test of a run makes."""
+        """Copies the sample data: that of TITLER_SAMPLES, which one run of the suite has made for all, or that which the
+        first test of this process makes."""
         cls = TitlerTest
+        if cls.samples is None:
+            cls.samples = os.environ.get("TITLER_SAMPLES")
         if cls.samples is None:
             cls.samples = tempfile.mkdtemp(prefix="titler-")
             atexit.register(shutil.rmtree, cls.samples, ignore_errors=True)
-            environment = dict(self.environment, K2SYS_AC_DATA=os.path.join(cls.samples, "d"))
-            subprocess.run([os.path.join(BUILD, "bin", "titler_provision")], env=environment, check=True,
-                           stdout=subprocess.DEVNULL)
+            samples.make(BUILD, cls.samples)
         data = self.environment["K2SYS_AC_DATA"]
-        shutil.copytree(os.path.join(cls.samples, "d"), data)
-        self.rewrite_paths(data, os.path.join(cls.samples, "d"), data)
+        samples.copy(cls.samples, data)
         return os.path.join(data, "defaultuser") + "/"
-
-    @staticmethod
-    def rewrite_paths(folder, before, after):
-        """Templates name their backgrounds by full paths, which have to lie below the data path."""
-        for parent, _, names in os.walk(folder):
-            for name in names:
-                if not name.endswith(".xml"):
-                    continue
-                path = os.path.join(parent, name)
-                with open(path, "r+", encoding="utf-8") as stream:
-                    text = stream.read()
-                    if before in text:
-                        stream.seek(0)
-                        stream.write(text.replace(before, after))
-                        stream.truncate()
 
     def start_programs(self):
         self.appliance = session.Appliance(BUILD, os.path.join(self.keep, "appliance.log"), self.environment)

@@ -9,7 +9,7 @@ import wire
 from mortal import MortalTitler
 from seededrandom import SeededRandom
 
-KILLS = int(os.environ.get("TITLER_KILLS", "25"))
+KILLS = int(os.environ.get("TITLER_KILLS", "10"))
 
 
 class Killed(MortalTitler, harness.TitlerTest):

@@ -11,7 +11,7 @@ from librarysession import COPY, FOLDER, LibrarySession
 from mortal import MortalTitler
 from seededrandom import SeededRandom
 
-KILLS = int(os.environ.get("TITLER_KILLS", "5"))
+KILLS = int(os.environ.get("TITLER_KILLS", "2"))
 
 
 class KilledSession(MortalTitler, LibrarySession):
