@@ -28,39 +28,39 @@ void EarlyRequests::clearInstance()
 
 EarlyRequests::EarlyRequests()
 {
-    mPatience.setSingleShot(true);
-    mPatience.setInterval(PATIENCE);
-    connect(&mPatience, &QTimer::timeout, this, &EarlyRequests::losePatience);
+    m_patience.setSingleShot(true);
+    m_patience.setInterval(PATIENCE);
+    connect(&m_patience, &QTimer::timeout, this, &EarlyRequests::losePatience);
 }
 
 void EarlyRequests::expectClientId(long service)
 {
-    mExpected.insert(service);
+    m_expected.insert(service);
 }
 
 void EarlyRequests::clientIdCame(long service)
 {
-    if (mExpected.remove(service) && mExpected.isEmpty())
+    if (m_expected.remove(service) && m_expected.isEmpty())
         carryOutKept();
 }
 
 void EarlyRequests::carryOut(std::function<void()> request)
 {
-    if (mExpected.isEmpty() && mKept.empty()) {
+    if (m_expected.isEmpty() && m_kept.empty()) {
         request();
         return;
     }
-    if (mKept.size() >= MAX_KEPT)
+    if (m_kept.size() >= MAX_KEPT)
         return;
-    mKept.push_back(std::move(request));
-    if (!mExpected.isEmpty() && !mPatience.isActive())
-        mPatience.start();
+    m_kept.push_back(std::move(request));
+    if (!m_expected.isEmpty() && !m_patience.isActive())
+        m_patience.start();
 }
 
 void EarlyRequests::carryOutKept()
 {
-    mPatience.stop();
-    if (!mKept.empty())
+    m_patience.stop();
+    if (!m_kept.empty())
         QMetaObject::invokeMethod(this, &EarlyRequests::carryOutNext, Qt::QueuedConnection);
 }
 
@@ -68,10 +68,10 @@ void EarlyRequests::carryOutKept()
 // for a dialog.
 void EarlyRequests::carryOutNext()
 {
-    if (mKept.empty())
+    if (m_kept.empty())
         return;
-    const std::function<void()> request = std::move(mKept.front());
-    mKept.pop_front();
+    const std::function<void()> request = std::move(m_kept.front());
+    m_kept.pop_front();
     carryOutKept();
     request();
 }
@@ -79,7 +79,7 @@ void EarlyRequests::carryOutNext()
 void EarlyRequests::losePatience()
 {
     LOG_DEBUG_OPERATE(L"EarlyRequests", LOG_NUMBER,
-                      std::to_wstring(mExpected.size()) + L" services have given no client id yet");
-    mExpected.clear();
+                      std::to_wstring(m_expected.size()) + L" services have given no client id yet");
+    m_expected.clear();
     carryOutKept();
 }

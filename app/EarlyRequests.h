@@ -44,7 +44,7 @@ private:
 
     static EarlyRequests* mInstance;
 
-    QSet<long> mExpected; // ids of the services whose client id is missing
-    std::deque<std::function<void()>> mKept;
-    QTimer mPatience;
+    QSet<long> m_expected; // ids of the services whose client id is missing
+    std::deque<std::function<void()>> m_kept;
+    QTimer m_patience;
 };

@@ -24,7 +24,7 @@ void EditContextController::clearInstance()
     mInstance = nullptr;
 }
 
-EditContextController::EditContextController() : mArchiveController(std::make_unique<ArchiveController>())
+EditContextController::EditContextController() : m_archiveController(std::make_unique<ArchiveController>())
 {
     qRegisterMetaType<titler_paramter>("titler_paramter");
 }
@@ -33,55 +33,55 @@ EditContextController::~EditContextController() = default;
 
 void EditContextController::showTitlerCreate(_CALL_TITLER_TYPE type)
 {
-    mCallType = type;
-    mIsCreate = true;
-    mFileList.clear();
+    m_callType = type;
+    m_isCreate = true;
+    m_fileList.clear();
     Q_EMIT signalShowTitlerParameter({_titler_paramter::CREATE_OR_EDIT, {}});
 }
 
 void EditContextController::showTitlerEdit(const _SHOW_TITLER_PARAMTER& param)
 {
-    mIsCreate = false;
-    mCallType = param.type;
+    m_isCreate = false;
+    m_callType = param.type;
     if (!param.path.empty())
         Q_EMIT signalShowTitlerParameter({_titler_paramter::CREATE_OR_EDIT, param.path});
 }
 
 void EditContextController::resultCallBack(ITitlerCallBack* callBack)
 {
-    mCallBack.reset(callBack);
+    m_callBack.reset(callBack);
 }
 
 bool EditContextController::isCreateNew()
 {
-    return mCallBack && mIsCreate;
+    return m_callBack && m_isCreate;
 }
 
 bool EditContextController::isMainNeedMsg()
 {
-    return mCallBack && !mIsCreate && !mFileList.isEmpty();
+    return m_callBack && !m_isCreate && !m_fileList.isEmpty();
 }
 
 bool EditContextController::isNewCreateFile(std::wstring path)
 {
-    return mFileList.contains(path);
+    return m_fileList.contains(path);
 }
 
 void EditContextController::insertFilePath(std::wstring path)
 {
-    if (!mFileList.contains(path))
-        mFileList.append(std::move(path));
+    if (!m_fileList.contains(path))
+        m_fileList.append(std::move(path));
 }
 
 void EditContextController::deleteFilePath(std::wstring path)
 {
-    mFileList.removeAll(path);
+    m_fileList.removeAll(path);
 }
 
 void EditContextController::setITitlerNoCallBack()
 {
-    mIsCreate = false;
-    mFileList.clear();
+    m_isCreate = false;
+    m_fileList.clear();
 }
 
 void EditContextController::sentITitlerCallBack(const std::wstring& folder)
@@ -89,7 +89,7 @@ void EditContextController::sentITitlerCallBack(const std::wstring& folder)
     if (!isCreateNew())
         return;
     orderFilePathList(QString::fromStdWString(folder));
-    packSendData(folder, {mFileList.cbegin(), mFileList.cend()});
+    packSendData(folder, {m_fileList.cbegin(), m_fileList.cend()});
     setITitlerNoCallBack();
 }
 
@@ -98,25 +98,25 @@ void EditContextController::sentITitlerCallBack(const std::wstring& folder)
 void EditContextController::orderFilePathList(const QString& folder)
 {
     QList<std::wstring> ordered;
-    const std::vector<ArchiveOrder*> rows = mArchiveController->getFileOrder(folder);
+    const std::vector<ArchiveOrder*> rows = m_archiveController->getFileOrder(folder);
     for (const ArchiveOrder* row : rows) {
         const std::wstring path = QString::fromLocal8Bit(row->getArchivePath()).toStdWString();
-        if (mFileList.contains(path))
+        if (m_fileList.contains(path))
             ordered.append(path);
     }
-    if (ordered.size() == mFileList.size())
-        mFileList = ordered;
+    if (ordered.size() == m_fileList.size())
+        m_fileList = ordered;
 }
 
 void EditContextController::packSendData(const std::wstring& folder, const std::vector<std::wstring>& paths)
 {
     simplebuffer buffer = TitlerParams::packPaths(paths);
     _CALLBACK_TITLER_PARAMTER record;
-    record.type = mCallType;
+    record.type = m_callType;
     record.path = folder;
     record.data = buffer.data;
     record.size = static_cast<int>(buffer.size);
     record.count = static_cast<int>(paths.size());
-    mCallBack->finishTitlerCreateCallback(record);
+    m_callBack->finishTitlerCreateCallback(record);
     CSimpleBuffer::simplebuffer_destroy(&buffer);
 }

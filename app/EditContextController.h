@@ -59,9 +59,9 @@ private:
 
     static EditContextController* mInstance;
 
-    std::unique_ptr<ITitlerCallBack> mCallBack;
-    bool mIsCreate = false;
-    _CALL_TITLER_TYPE mCallType = -1;
-    QList<std::wstring> mFileList;
-    std::unique_ptr<ArchiveController> mArchiveController;
+    std::unique_ptr<ITitlerCallBack> m_callBack;
+    bool m_isCreate = false;
+    _CALL_TITLER_TYPE m_callType = -1;
+    QList<std::wstring> m_fileList;
+    std::unique_ptr<ArchiveController> m_archiveController;
 };

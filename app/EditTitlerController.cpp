@@ -34,30 +34,30 @@ EditTitlerController::~EditTitlerController() = default;
 
 void EditTitlerController::setFactory(TitlerToolFactory* factory)
 {
-    mLink.connectTo(factory, this);
+    m_link.connectTo(factory, this);
 }
 
 void EditTitlerController::getClientID(int id)
 {
-    mLink.clientIdCame(id, this);
+    m_link.clientIdCame(id, this);
 }
 
 void EditTitlerController::editFolderStartStatus(QString folder)
 {
-    if (mLink)
-        mLink->titlerEditStatus({mLink.clientId(), folder.toStdWString()});
+    if (m_link)
+        m_link->titlerEditStatus({m_link.clientId(), folder.toStdWString()});
 }
 
 void EditTitlerController::editFolderEndStatus(QString folder)
 {
-    if (mLink)
-        mLink->titlerEditEndStatus({mLink.clientId(), folder.toStdWString()});
+    if (m_link)
+        m_link->titlerEditEndStatus({m_link.clientId(), folder.toStdWString()});
 }
 
 void EditTitlerController::renameFolderStartStatus(QString folder)
 {
-    if (mLink)
-        mLink->renameFolderStart({mLink.clientId(), folder.toStdWString()});
+    if (m_link)
+        m_link->renameFolderStart({m_link.clientId(), folder.toStdWString()});
 }
 
 // Queued to the GUI thread, since the picture thread calls this, too, and a sender must be used in one thread
@@ -69,20 +69,20 @@ void EditTitlerController::changeTitlerStatus(FileManagerDefine::emTITLECHANGE_T
             this, [this, type, path] { changeTitlerStatus(type, path); }, Qt::QueuedConnection);
         return;
     }
-    if (mLink)
-        mLink->updateTitlerStatus({mLink.clientId(), path.toStdWString(), type});
+    if (m_link)
+        m_link->updateTitlerStatus({m_link.clientId(), path.toStdWString(), type});
 }
 
 void EditTitlerController::changeTitlerFolderName(QString oldPath, QString newPath)
 {
-    if (mLink)
-        mLink->updateTitlerFolderName({mLink.clientId(), oldPath.toStdWString(), newPath.toStdWString()});
+    if (m_link)
+        m_link->updateTitlerFolderName({m_link.clientId(), oldPath.toStdWString(), newPath.toStdWString()});
 }
 
 void EditTitlerController::updateTitlerOrder(QString folder)
 {
-    if (mLink)
-        mLink->updateTitlerOrder({mLink.clientId(), folder.toStdWString()});
+    if (m_link)
+        m_link->updateTitlerOrder({m_link.clientId(), folder.toStdWString()});
 }
 
 void EditTitlerController::importNotify(FileManagerDefine::tagImportNotify notify)

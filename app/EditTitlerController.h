@@ -58,5 +58,5 @@ private:
 
     static EditTitlerController* mpInstance;
 
-    ServiceLink<IFileManagerController> mLink;
+    ServiceLink<IFileManagerController> m_link;
 };

@@ -31,14 +31,14 @@ ShowMessageController::~ShowMessageController() = default;
 
 void ShowMessageController::setFactory(TitlerToolFactory* factory)
 {
-    if (!mLink.isConnected())
+    if (!m_link.isConnected())
         LOG_DEBUG_OPERATE(L"ShowMessageController", 200, L"ShowMessageController::setFactory");
-    mLink.connectTo(factory, this);
+    m_link.connectTo(factory, this);
 }
 
 void ShowMessageController::setClientID(int id)
 {
-    mLink.clientIdCame(id, this);
+    m_link.clientIdCame(id, this);
 }
 
 void ShowMessageController::postMessage(MessageDef::Message_ID id)
@@ -54,47 +54,47 @@ void ShowMessageController::postMessage(MessageDef::Message_ID id, QString text)
 void ShowMessageController::postMessage(MessageDef::Message_ID id, MessageDefine::_emBoxType boxType,
                                         QString text)
 {
-    if (!mLink)
+    if (!m_link)
         return;
     MessageDefine::_tagMessageParam param;
-    param.clientId = mLink.clientId();
+    param.clientId = m_link.clientId();
     param.boxType = boxType;
     param.text = text.toStdWString();
     param.messageId = id;
-    mLink->postMessage(param);
+    m_link->postMessage(param);
 }
 
 void ShowMessageController::setMessageMainWindow(QWidget* window)
 {
     if (window)
-        mMainWindow = window;
+        m_mainWindow = window;
 }
 
 bool ShowMessageController::GetTitlerIsTop()
 {
-    return mTitlerIsTop;
+    return m_titlerIsTop;
 }
 
 QMap<QString, QString> ShowMessageController::getMapData()
 {
-    return mMapData;
+    return m_mapData;
 }
 
 void ShowMessageController::closeMessage(MessageDefine::_emCloseType type)
 {
-    if (mLink)
-        mLink->closeMessage({mLink.clientId(), type, mLastMessageId});
+    if (m_link)
+        m_link->closeMessage({m_link.clientId(), type, m_lastMessageId});
 }
 
 void ShowMessageController::changeTopWindow(MessageDefine::_emTopWindow top)
 {
-    if (mLink)
-        mLink->setTopWindow({mLink.clientId(), top});
+    if (m_link)
+        m_link->setTopWindow({m_link.clientId(), top});
 }
 
 bool ShowMessageController::mainWindowIsShown() const
 {
-    return mMainWindow && !mMainWindow->isHidden();
+    return m_mainWindow && !m_mainWindow->isHidden();
 }
 
 void ShowMessageController::showDialogOpacityWidget()
@@ -121,13 +121,13 @@ void ShowMessageController::hideMessageOpacityWidget()
 
 void ShowMessageController::getTopWindowNotify(int top)
 {
-    mTitlerIsTop = top == MessageDefine::TOP_WINDOW_TITLER;
+    m_titlerIsTop = top == MessageDefine::TOP_WINDOW_TITLER;
 }
 
 void ShowMessageController::postMessageNotify(MessageDefine::_tagMessageParam param)
 {
-    if (mTitlerIsTop)
-        mLastMessageId = param.messageId;
+    if (m_titlerIsTop)
+        m_lastMessageId = param.messageId;
 }
 
 void ShowMessageController::closeMessageNotify(MessageDefine::_tagCloseParam param)

@@ -65,9 +65,9 @@ private:
 
     static ShowMessageController* mInstance;
 
-    int mLastMessageId = -1;
-    ServiceLink<IMessageCenter> mLink;
-    QMap<QString, QString> mMapData;
-    QPointer<QWidget> mMainWindow;
-    bool mTitlerIsTop = false;
+    int m_lastMessageId = -1;
+    ServiceLink<IMessageCenter> m_link;
+    QMap<QString, QString> m_mapData;
+    QPointer<QWidget> m_mainWindow;
+    bool m_titlerIsTop = false;
 };

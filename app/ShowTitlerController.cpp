@@ -26,17 +26,17 @@ ShowTitlerController::ShowTitlerController()
 
 void ShowTitlerController::setFactory(TitlerToolFactory* factory)
 {
-    mProxy = factory->createService<IShowTitlerController>();
-    if (mProxy)
-        mProxy->registerCallBack(this);
+    m_proxy = factory->createService<IShowTitlerController>();
+    if (m_proxy)
+        m_proxy->registerCallBack(this);
 }
 
 void ShowTitlerController::changeFolderStatus(SubCommonDefine::tagFOLDER_TYPE folder)
 {
     LOG_DEBUG_OPERATE(L"ShowTitlerController", 200,
                       L"ShowTitlerController_changeFolderStatus() [setFolderStatus()] Path:" + folder.path);
-    if (mProxy)
-        mProxy->setFolderStatus(std::move(folder));
+    if (m_proxy)
+        m_proxy->setFolderStatus(std::move(folder));
 }
 
 void ShowTitlerController::showTitler()

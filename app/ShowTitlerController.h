@@ -32,5 +32,5 @@ private:
 
     static ShowTitlerController* mInstance;
 
-    IShowTitlerController* mProxy = nullptr;
+    IShowTitlerController* m_proxy = nullptr;
 };

@@ -14,7 +14,7 @@ namespace
 constexpr int RETRY_MS = 20;
 }
 
-SiblingWait::SiblingWait(std::vector<long> missing) : mMissing(std::move(missing))
+SiblingWait::SiblingWait(std::vector<long> missing) : m_missing(std::move(missing))
 {
 }
 
@@ -40,7 +40,7 @@ bool SiblingWait::waitFor(SocketRemoteSender& sender, long client)
 void SiblingWait::report() const
 {
     std::string ports;
-    for (const long client : mMissing)
+    for (const long client : m_missing)
         ports += (ports.empty() ? "port " : ", port ") + std::to_string(SocketFrame::portOf(client));
     std::fprintf(stderr, "titler: waiting for sibling processes to listen on 127.0.0.1: %s\n", ports.c_str());
 }

@@ -22,5 +22,5 @@ public:
 private:
     void report() const;
 
-    std::vector<long> mMissing;
+    std::vector<long> m_missing;
 };

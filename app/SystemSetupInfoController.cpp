@@ -31,12 +31,12 @@ SystemSetupInfoController::~SystemSetupInfoController() = default;
 
 void SystemSetupInfoController::setFactory(TitlerToolFactory* factory)
 {
-    mLink.connectTo(factory, this);
+    m_link.connectTo(factory, this);
 }
 
 void SystemSetupInfoController::getClientID(int id)
 {
-    mLink.clientIdCame(id, this, [this] {
+    m_link.clientIdCame(id, this, [this] {
         getModuleInfo();
         getLanguageInfo();
     });
@@ -45,24 +45,24 @@ void SystemSetupInfoController::getClientID(int id)
 void SystemSetupInfoController::getInputLanguage()
 {
     Q_EMIT signalsInputLanguageInfo(
-        static_cast<SystemSetupDef::emInputLanguageType>(mLanguage.inputLanguage));
+        static_cast<SystemSetupDef::emInputLanguageType>(m_language.inputLanguage));
 }
 
 void SystemSetupInfoController::getModuleInfo()
 {
-    if (mLink)
-        mLink->getInformation(mLink.clientId());
+    if (m_link)
+        m_link->getInformation(m_link.clientId());
 }
 
 void SystemSetupInfoController::getLanguageInfo()
 {
-    if (mLink)
-        mLink->getLanguageInfo(mLink.clientId());
+    if (m_link)
+        m_link->getLanguageInfo(m_link.clientId());
 }
 
 void SystemSetupInfoController::getLanguageInfoCallBack(SystemSetupDef::tagSystemLanguageParam param)
 {
-    mLanguage = param;
+    m_language = param;
     getInputLanguage();
     Q_EMIT signalsSystemLanguageInfo(static_cast<SystemSetupDef::emSystemLanguageType>(param.systemLanguage));
 }
@@ -74,12 +74,12 @@ void SystemSetupInfoController::getInformationCallBack(SystemSetupDef::tagSystem
 
 void SystemSetupInfoController::setSystemLanguageNotify(int language)
 {
-    mLanguage.systemLanguage = language;
+    m_language.systemLanguage = language;
     Q_EMIT signalsSystemLanguageInfo(static_cast<SystemSetupDef::emSystemLanguageType>(language));
 }
 
 void SystemSetupInfoController::setInputLanguageNotify(int language)
 {
-    mLanguage.inputLanguage = language;
+    m_language.inputLanguage = language;
     getInputLanguage();
 }

@@ -44,6 +44,6 @@ private:
 
     static SystemSetupInfoController* mpInstance;
 
-    ServiceLink<ISystemSetupManager> mLink;
-    SystemSetupDef::tagSystemLanguageParam mLanguage;
+    ServiceLink<ISystemSetupManager> m_link;
+    SystemSetupDef::tagSystemLanguageParam m_language;
 };

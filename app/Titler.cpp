@@ -5,32 +5,32 @@
 #include "app/ShowMessageController.h"
 
 Titler::Titler()
-    : mEditContext(EditContextController::getInstance()), mShowMessage(ShowMessageController::getInstance())
+    : m_editContext(EditContextController::getInstance()), m_showMessage(ShowMessageController::getInstance())
 {
 }
 
 void Titler::registerCallBack(ITitlerCallBack* callBack)
 {
-    mEditContext->resultCallBack(callBack);
+    m_editContext->resultCallBack(callBack);
 }
 
 void Titler::showTitlerCreate(_CALL_TITLER_TYPE type)
 {
-    EarlyRequests::getInstance()->carryOut([this, type] { mEditContext->showTitlerCreate(type); });
+    EarlyRequests::getInstance()->carryOut([this, type] { m_editContext->showTitlerCreate(type); });
 }
 
 void Titler::showTitlerEdit(_SHOW_TITLER_PARAMTER param)
 {
-    EarlyRequests::getInstance()->carryOut([this, param] { mEditContext->showTitlerEdit(param); });
+    EarlyRequests::getInstance()->carryOut([this, param] { m_editContext->showTitlerEdit(param); });
 }
 
 void Titler::showDialogMaskWidget(bool show)
 {
     EarlyRequests::getInstance()->carryOut([this, show] {
         if (show)
-            mShowMessage->showDialogOpacityWidget();
+            m_showMessage->showDialogOpacityWidget();
         else
-            mShowMessage->hideDialogOpacityWidget();
+            m_showMessage->hideDialogOpacityWidget();
     });
 }
 
@@ -38,8 +38,8 @@ void Titler::showMessageMaskWidget(bool show)
 {
     EarlyRequests::getInstance()->carryOut([this, show] {
         if (show)
-            mShowMessage->showMessageOpacityWidget();
+            m_showMessage->showMessageOpacityWidget();
         else
-            mShowMessage->hideMessageOpacityWidget();
+            m_showMessage->hideMessageOpacityWidget();
     });
 }

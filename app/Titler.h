@@ -19,6 +19,6 @@ public:
     void showMessageMaskWidget(bool show) override;
 
 private:
-    EditContextController* mEditContext;
-    ShowMessageController* mShowMessage;
+    EditContextController* m_editContext;
+    ShowMessageController* m_showMessage;
 };

@@ -30,25 +30,25 @@ TitlerAPPEventFilterController::~TitlerAPPEventFilterController() = default;
 
 void TitlerAPPEventFilterController::initialize(TitlerToolFactory* factory)
 {
-    mLink.connectTo(factory, this);
+    m_link.connectTo(factory, this);
 }
 
 void TitlerAPPEventFilterController::setClientID(int id)
 {
-    mLink.clientIdCame(id, this);
+    m_link.clientIdCame(id, this);
 }
 
 void TitlerAPPEventFilterController::sendAPPEvent(APPEventDefine::LOCKTYPE type, bool on)
 {
-    if (mLink)
-        mLink->postAPPEventFilter({mLink.clientId(), type, on, APPEventDefine::EVENTREVICER_TITLER});
+    if (m_link)
+        m_link->postAPPEventFilter({m_link.clientId(), type, on, APPEventDefine::EVENTREVICER_TITLER});
 }
 
 void TitlerAPPEventFilterController::informRestoreOriginal(APPEventDefine::EventRevicer receiver)
 {
-    if (mLink)
-        mLink->postRestoreOriginal(
-            {mLink.clientId(), APPEventDefine::LOCKTYPE_NONE, false, APPEventDefine::EVENTREVICER_TITLER});
+    if (m_link)
+        m_link->postRestoreOriginal(
+            {m_link.clientId(), APPEventDefine::LOCKTYPE_NONE, false, APPEventDefine::EVENTREVICER_TITLER});
     if (receiver == APPEventDefine::EVENTREVICER_RESTORE_ALL)
         Q_EMIT signalRestoreOriginal();
 }

@@ -33,5 +33,5 @@ private:
 
     static TitlerAPPEventFilterController* mInstance;
 
-    ServiceLink<IAPPEventFilter> mLink;
+    ServiceLink<IAPPEventFilter> m_link;
 };

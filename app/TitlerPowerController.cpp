@@ -30,20 +30,20 @@ void TitlerPowerController::clearInstance()
 TitlerPowerController::~TitlerPowerController()
 {
     LOG_EVENT(L"[TitlerPowerController][~TitlerPowerController]", 200, L" Titler closeClient", 6);
-    if (!mLink || !mLink.isConnected())
+    if (!m_link || !m_link.isConnected())
         return;
-    mLink->closeClient(mLink.clientId());
+    m_link->closeClient(m_link.clientId());
     ::sleep(DROP_CLIENT_SECONDS);
 }
 
 void TitlerPowerController::setFactory(TitlerToolFactory* factory)
 {
-    mLink.connectTo(factory, this);
+    m_link.connectTo(factory, this);
 }
 
 void TitlerPowerController::getClientID(int id)
 {
-    mLink.clientIdCame(id, this);
+    m_link.clientIdCame(id, this);
 }
 
 void TitlerPowerController::powerOff()

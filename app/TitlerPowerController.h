@@ -31,5 +31,5 @@ private:
 
     static TitlerPowerController* mInstance;
 
-    ServiceLink<IPowerManager> mLink;
+    ServiceLink<IPowerManager> m_link;
 };

@@ -29,12 +29,12 @@ TitlerProjectDataController::~TitlerProjectDataController() = default;
 
 void TitlerProjectDataController::setFactory(TitlerToolFactory* factory)
 {
-    mLink.connectTo(factory, this);
+    m_link.connectTo(factory, this);
 }
 
 void TitlerProjectDataController::getClientID(int id)
 {
-    mLink.clientIdCame(id, this);
+    m_link.clientIdCame(id, this);
 }
 
 void TitlerProjectDataController::loadNotify(int state)

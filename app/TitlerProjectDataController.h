@@ -28,5 +28,5 @@ private:
 
     static TitlerProjectDataController* mInstance;
 
-    ServiceLink<IProjectDataManager> mLink;
+    ServiceLink<IProjectDataManager> m_link;
 };

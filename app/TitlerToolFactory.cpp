@@ -34,17 +34,17 @@ bool TitlerToolFactory::initialize()
     CSimpleBuffer::simplebuffer_system_init(MINIMUM_ALLOCATION_UNIT, myMalloc, myFree);
 
     auto receiver = std::make_unique<PTC::QtReceiver>(TITLER_RECEIVER_ID);
-    if (!mTitler)
-        mTitler = std::make_unique<Titler>();
+    if (!m_titler)
+        m_titler = std::make_unique<Titler>();
     auto* adapter = new TitlerAdapter(TITLER_INTERFACE_ID);
     adapter->setProxyFactory(this);
-    adapter->setTarget(mTitler.get());
+    adapter->setTarget(m_titler.get());
     receiver->addAdapter(adapter);
-    mReceiver = receiver.get();
+    m_receiver = receiver.get();
 
     auto remoteReceiver = std::make_unique<SocketRemoteReceiver>(SOCKET_RECEIVER_ID);
     if (!remoteReceiver->initialize(TITLER_CLIENT_NUMBER)) {
-        mUnboundReceiver = std::move(receiver);
+        m_unboundReceiver = std::move(receiver);
         return false;
     }
     remoteReceiver->addReceiver(receiver.release());
@@ -86,25 +86,25 @@ void TitlerToolFactory::createInstance(long id, void** out)
     if (!sender)
         return;
     PTC::Proxy* proxy = made.get();
-    mProxies.push_back(std::move(made));
+    m_proxies.push_back(std::move(made));
     proxy->setAdapterFactory(this);
     proxy->setSender(sender);
-    proxy->setReceiver(mReceiver);
+    proxy->setReceiver(m_receiver);
     *out = instance;
 }
 
 void TitlerToolFactory::RegisterObject(long id, void* object)
 {
-    if (id == TITLER_INTERFACE_ID && !mTitler)
-        mTitler.reset(static_cast<ITitler*>(object));
+    if (id == TITLER_INTERFACE_ID && !m_titler)
+        m_titler.reset(static_cast<ITitler*>(object));
 }
 
 PTC::IAdapterBase* TitlerToolFactory::createAdapter(long type, PTC::IReceiver* receiver, void* target)
 {
-    PTC::IAdapterBase* adapter = ServiceFamilies::createAdapter(type, mNextAdapterId);
+    PTC::IAdapterBase* adapter = ServiceFamilies::createAdapter(type, m_nextAdapterId);
     if (!adapter)
         return nullptr;
-    ++mNextAdapterId;
+    ++m_nextAdapterId;
     adapter->setTarget(target);
     receiver->addCBAdapter(adapter);
     return adapter;
@@ -119,7 +119,7 @@ PTC::IProxyBase* TitlerToolFactory::createProxy(long type, long id, long client)
         reportRefusal(client);
         return nullptr;
     }
-    mLastRefusedClient.reset();
+    m_lastRefusedClient.reset();
     auto* proxy = new TitlerCallBackRemoteProxy(id);
     proxy->setSender(sender);
     return proxy;
@@ -141,9 +141,9 @@ PTC::ISender* TitlerToolFactory::callBackSender(long client)
 // Logs repeated refusals of a client once.
 void TitlerToolFactory::reportRefusal(long client)
 {
-    if (mLastRefusedClient == client)
+    if (m_lastRefusedClient == client)
         return;
-    mLastRefusedClient = client;
+    m_lastRefusedClient = client;
     LOG_DEBUG_OPERATE(L"TitlerToolFactory", LOG_NUMBER,
                       L"No result will go to client " + std::to_wstring(client) +
                           L": it is unknown or does not listen");

@@ -66,10 +66,10 @@ private:
     PTC::ISender* callBackSender(long client);
     void reportRefusal(long client);
 
-    std::unique_ptr<ITitler> mTitler;
-    PTC::QtReceiver* mReceiver = nullptr;              // owned by the remote receiver while listening
-    std::unique_ptr<PTC::QtReceiver> mUnboundReceiver; // owns mReceiver when the port could not be bound
-    std::vector<std::unique_ptr<PTC::IObject>> mProxies;
-    long mNextAdapterId = 0;
-    std::optional<long> mLastRefusedClient;
+    std::unique_ptr<ITitler> m_titler;
+    PTC::QtReceiver* m_receiver = nullptr;              // owned by the remote receiver while listening
+    std::unique_ptr<PTC::QtReceiver> m_unboundReceiver; // owns m_receiver when the port could not be bound
+    std::vector<std::unique_ptr<PTC::IObject>> m_proxies;
+    long m_nextAdapterId = 0;
+    std::optional<long> m_lastRefusedClient;
 };

@@ -88,7 +88,7 @@ TitlerWindow::TitlerWindow(bool deferArchiveList, QWidget* parent)
     KSMenu::setMainWindow(this);
     KSScrollViewerWidget::s_mainWnd = this;
     ICanvasHost::setInstance(this);
-    mLinks = std::make_unique<SiblingLinks>();
+    m_links = std::make_unique<SiblingLinks>();
 
     setWindowTitle(tr("Titler"));
     setGeometry(MAIN_RECT);
@@ -97,16 +97,16 @@ TitlerWindow::TitlerWindow(bool deferArchiveList, QWidget* parent)
     windowPalette.setColor(QPalette::Window, Qt::black);
     setPalette(windowPalette);
 
-    mUndoStack.setUndoLimit(UNDO_LIMIT);
+    m_undoStack.setUndoLimit(UNDO_LIMIT);
     initWindowWidget(deferArchiveList);
     initChildWindows();
     connectWidget();
     Balloon::s_ParentWindow = this;
     KSToolTip::s_mainWindow = this;
-    mLinks->initProcessFactory();
-    mLinks->initProcessCommunications(winId());
+    m_links->initProcessFactory();
+    m_links->initProcessCommunications(winId());
     connectForController();
-    mArchiveList->setMainScene(mCanvasScene);
+    m_archiveList->setMainScene(m_canvasScene);
     if (APPEventFilter* filter = APPEventFilter::instance())
         filter->registerEventFilter(this);
 }
@@ -117,20 +117,20 @@ TitlerWindow::~TitlerWindow()
     if (APPEventFilter* filter = APPEventFilter::instance())
         filter->unegisterEventFilter(this);
     // The canvas is deleted before the service links, through which its workers report.
-    mUndoStack.clear();
-    delete mFolderPicker;
-    delete mTextToolsPanel;
+    m_undoStack.clear();
+    delete m_folderPicker;
+    delete m_textToolsPanel;
     KSToolTip::clearInstance();
     KSToolTip::s_mainWindow = nullptr;
     Balloon::s_ParentWindow = nullptr;
     KSMenu::setMainWindow(nullptr);
     KSScrollViewerWidget::s_mainWnd.clear();
-    delete mArchiveList;
-    delete mGraphicsView;
-    delete mCanvasScene;
+    delete m_archiveList;
+    delete m_graphicsView;
+    delete m_canvasScene;
 
     ICanvasHost::setInstance(nullptr);
-    mLinks.reset();
+    m_links.reset();
     UNINIT_LOGGING();
 }
 
@@ -153,22 +153,22 @@ void TitlerWindow::initWindowWidget(bool deferArchiveList)
     createCanvasScene();
     QWidget* leftColumn = createArchiveList(deferArchiveList);
     createTextToolsPanel();
-    WindowLayout::arrange(this, leftColumn, mToolsBar, mGraphicsView, mTextToolsPanel);
+    WindowLayout::arrange(this, leftColumn, m_toolsBar, m_graphicsView, m_textToolsPanel);
 }
 
 void TitlerWindow::createToolsBar()
 {
-    mToolsBar = new ToolsBar(mUndoStack.createUndoAction(this), mUndoStack.createRedoAction(this), this);
+    m_toolsBar = new ToolsBar(m_undoStack.createUndoAction(this), m_undoStack.createRedoAction(this), this);
 }
 
 void TitlerWindow::createCanvasScene()
 {
-    mCanvasScene = new CanvasScene(std::make_unique<ThumbnailRender>(), this);
-    mCanvasScene->setSceneRect(SCENE_RECT);
-    mGraphicsView = new GraphicsView(mCanvasScene, this);
-    mGraphicsView->setStyleSheet(QStringLiteral("background-color:transparent; border:0"));
-    mGraphicsView->setFixedSize(SCENE_RECT.size());
-    connect(mGraphicsView, &GraphicsView::deleteEmptyItem, this, &TitlerWindow::slotDeleteEmptyItems);
+    m_canvasScene = new CanvasScene(std::make_unique<ThumbnailRender>(), this);
+    m_canvasScene->setSceneRect(SCENE_RECT);
+    m_graphicsView = new GraphicsView(m_canvasScene, this);
+    m_graphicsView->setStyleSheet(QStringLiteral("background-color:transparent; border:0"));
+    m_graphicsView->setFixedSize(SCENE_RECT.size());
+    connect(m_graphicsView, &GraphicsView::deleteEmptyItem, this, &TitlerWindow::slotDeleteEmptyItems);
 }
 
 // Returns the left column: the title row above the list.
@@ -179,28 +179,28 @@ QWidget* TitlerWindow::createArchiveList(bool deferArchiveList)
     // Fixed, since lines are higher in some families, and the list below has a frame at a fixed place.
     pathLabel->setFixedHeight(TITLE_ROW_HEIGHT);
 
-    mMoveMode = std::make_unique<MoveMode>(this);
-    connect(mMoveMode->button(), &QPushButton::clicked, this, &TitlerWindow::editAndDoneButtonClicked);
-    connect(mMoveMode->button(), &QPushButton::pressed, this, &TitlerWindow::moveButtonPressed);
-    connect(mMoveMode->button(), &QPushButton::released, this, &TitlerWindow::moveButtonReleased);
+    m_moveMode = std::make_unique<MoveMode>(this);
+    connect(m_moveMode->button(), &QPushButton::clicked, this, &TitlerWindow::editAndDoneButtonClicked);
+    connect(m_moveMode->button(), &QPushButton::pressed, this, &TitlerWindow::moveButtonPressed);
+    connect(m_moveMode->button(), &QPushButton::released, this, &TitlerWindow::moveButtonReleased);
 
-    mArchiveList = new ArchiveList(pathLabel, !deferArchiveList, this);
-    mArchiveList->setFixedSize(ARCHIVELISTWIDGET_WIDTH, ARCHIVELISTWIDGET_HEIGHT);
-    return WindowLayout::leftColumn(this, pathLabel, mMoveMode->button(), mArchiveList);
+    m_archiveList = new ArchiveList(pathLabel, !deferArchiveList, this);
+    m_archiveList->setFixedSize(ARCHIVELISTWIDGET_WIDTH, ARCHIVELISTWIDGET_HEIGHT);
+    return WindowLayout::leftColumn(this, pathLabel, m_moveMode->button(), m_archiveList);
 }
 
 void TitlerWindow::createTextToolsPanel()
 {
-    mTextToolsPanel = new TextToolsPanel(this);
+    m_textToolsPanel = new TextToolsPanel(this);
 }
 
 void TitlerWindow::initChildWindows()
 {
-    mSavingNotice = new SavingNotice(this);
-    mFolderPicker = new FolderPicker(this);
-    mTemplatePicker = new TemplatePicker(this);
-    mMasks = std::make_unique<WindowMasks>(this, mTextToolsPanel, mFolderPicker, mTemplatePicker);
-    mDialogs = std::make_unique<WindowDialogs>(this, mMasks.get(), mFolderPicker, mTemplatePicker);
+    m_savingNotice = new SavingNotice(this);
+    m_folderPicker = new FolderPicker(this);
+    m_templatePicker = new TemplatePicker(this);
+    m_masks = std::make_unique<WindowMasks>(this, m_textToolsPanel, m_folderPicker, m_templatePicker);
+    m_dialogs = std::make_unique<WindowDialogs>(this, m_masks.get(), m_folderPicker, m_templatePicker);
 }
 
 // --- Events ---------------------------------------------------------------------------------------------
@@ -209,12 +209,12 @@ void TitlerWindow::paintEvent(QPaintEvent* event)
 {
     QMainWindow::paintEvent(event);
     QPainter painter(this);
-    mBackground.paint(painter);
+    m_background.paint(painter);
 }
 
 void TitlerWindow::resizeEvent(QResizeEvent* event)
 {
-    mBackground.makeFrames();
+    m_background.makeFrames();
     Q_EMIT titlerWindowGeometry(geometry());
     QMainWindow::resizeEvent(event);
 }
@@ -227,13 +227,13 @@ void TitlerWindow::showEvent(QShowEvent* event)
 
 void TitlerWindow::hideEvent(QHideEvent* event)
 {
-    mCanvasScene->endPreview(); // the palette is a separate window
+    m_canvasScene->endPreview(); // the palette is a separate window
     WINDOW_IS_SHOWN = false;
     if (!event->spontaneous()) {
         // The process that requested a mask may remove it much later, or never.
         slotShowDialogMaskWidget(false);
         slotShowMessageMaskWidget(false);
-        if (KSInputContext* context = mLinks->inputContext())
+        if (KSInputContext* context = m_links->inputContext())
             context->setWindowID(winId());
     }
     QMainWindow::hideEvent(event);
@@ -242,7 +242,7 @@ void TitlerWindow::hideEvent(QHideEvent* event)
 // Treats a close by the window manager like the Close button, so the process continues.
 void TitlerWindow::closeEvent(QCloseEvent* event)
 {
-    if (mSessionEnd.closesWindow()) {
+    if (m_sessionEnd.closesWindow()) {
         QMainWindow::closeEvent(event);
         QCoreApplication::quit();
         return;
@@ -269,7 +269,7 @@ void TitlerWindow::mousePressEvent(QMouseEvent* event)
 
 bool TitlerWindow::eventFilter(QObject* obj, QEvent* event)
 {
-    if (mArchiveList->getMoveState())
+    if (m_archiveList->getMoveState())
         return false;
     if (ignoreMouseAndTouchEventWhenArchiveListIsMoveMode(obj, event))
         return true;
@@ -278,10 +278,10 @@ bool TitlerWindow::eventFilter(QObject* obj, QEvent* event)
     case QEvent::TouchBegin:
         if (qobject_cast<QMenu*>(obj))
             return false;
-        mArchiveList->clearOperationItemState(mArchiveList->getCurrentOperationArchive());
+        m_archiveList->clearOperationItemState(m_archiveList->getCurrentOperationArchive());
         break;
     case QEvent::MouseButtonRelease:
-        if (obj == mArchiveList)
+        if (obj == m_archiveList)
             hideSoftWareWithOutDeleteEmptyItems();
         break;
     default:
@@ -297,7 +297,7 @@ bool TitlerWindow::ignoreTouchEventWhenSliderIsShowing(QObject* obj, QEvent* eve
     case QEvent::TouchBegin:
     case QEvent::TouchUpdate:
     case QEvent::TouchEnd:
-        return obj && !qobject_cast<QSlider*>(obj) && mTextToolsPanel->edgeSliderIsShown();
+        return obj && !qobject_cast<QSlider*>(obj) && m_textToolsPanel->edgeSliderIsShown();
     default:
         return false;
     }
@@ -305,7 +305,7 @@ bool TitlerWindow::ignoreTouchEventWhenSliderIsShowing(QObject* obj, QEvent* eve
 
 bool TitlerWindow::ignoreMouseAndTouchEventWhenArchiveListIsMoveMode(QObject* obj, QEvent* event)
 {
-    if (!mMoveMode->isEndedBy(obj, event, mArchiveList))
+    if (!m_moveMode->isEndedBy(obj, event, m_archiveList))
         return false;
     slotCancelArchiveListMoveMode();
     if (event->type() == QEvent::TouchBegin)
@@ -319,7 +319,7 @@ void TitlerWindow::showTitlerWindow(titler_paramter paramter)
 {
     if (!isHidden())
         return;
-    mUnsavedWork.takeQuestion();
+    m_unsavedWork.takeQuestion();
     const RequestedPath path(QString::fromStdWString(paramter.path));
     // A window that is hidden right after it was shown confuses window managers: they may handle the end of
     // it so late that they unmap the window of the next request.
@@ -328,34 +328,34 @@ void TitlerWindow::showTitlerWindow(titler_paramter paramter)
         activateWindow();
         raise();
     }
-    mLinks->changeTopWindow(MessageDefine::TOP_WINDOW_TITLER);
-    mLinks->setMessageMainWindow(this);
-    mCanvasScene->setModuleInfo(m_emModuleInfo);
-    mTextToolsPanel->setModuleInfo(m_emModuleInfo);
-    mTextToolsPanel->initTextToolsPanel();
-    mTemplatePicker->setModuleInfo(m_emModuleInfo);
+    m_links->changeTopWindow(MessageDefine::TOP_WINDOW_TITLER);
+    m_links->setMessageMainWindow(this);
+    m_canvasScene->setModuleInfo(m_emModuleInfo);
+    m_textToolsPanel->setModuleInfo(m_emModuleInfo);
+    m_textToolsPanel->initTextToolsPanel();
+    m_templatePicker->setModuleInfo(m_emModuleInfo);
 
-    mToolsBar->setFolderButtonEnabled(true);
-    mDialogs->initFolderPicker();
+    m_toolsBar->setFolderButtonEnabled(true);
+    m_dialogs->initFolderPicker();
     beginSession(paramter);
 
-    if (const std::optional<QString> font = std::exchange(mMissingFont, std::nullopt))
-        mLinks->postMessage(MessageDef::MESSAGE_FONT_MISSING, *font);
-    mLinks->getInputLanguage();
+    if (const std::optional<QString> font = std::exchange(m_missingFont, std::nullopt))
+        m_links->postMessage(MessageDef::MESSAGE_FONT_MISSING, *font);
+    m_links->getInputLanguage();
     changeFontComboxItem(m_emModuleInfo);
 }
 
 void TitlerWindow::beginSession(const titler_paramter& parameter)
 {
-    mSessionEnd.beginSession(parameter.mode == _titler_paramter::CREATE_OR_EDIT);
+    m_sessionEnd.beginSession(parameter.mode == _titler_paramter::CREATE_OR_EDIT);
     if (parameter.mode == _titler_paramter::CREATE_OR_EDIT) {
-        mToolsBar->setFolderButtonEnabled(false);
-        mFolderPicker->setDuplicateButtonEnabled(false);
-        mFolderPicker->setCreateFolderButtonEnabled(false);
+        m_toolsBar->setFolderButtonEnabled(false);
+        m_folderPicker->setDuplicateButtonEnabled(false);
+        m_folderPicker->setCreateFolderButtonEnabled(false);
         refreshArchiveList(QString::fromStdWString(parameter.path));
     } else if (parameter.mode == _titler_paramter::SUB_PANEL) {
         EditContextController::getInstance()->setITitlerNoCallBack();
-        mFolderPicker->updateTreeView();
+        m_folderPicker->updateTreeView();
         showFolderDialog();
     }
 }
@@ -365,14 +365,14 @@ void TitlerWindow::refreshArchiveList(QString path)
     const RequestedPath requested(path);
     switch (requested.target()) {
     case RequestedPath::Target::Choice:
-        mFolderPicker->updateTreeView();
+        m_folderPicker->updateTreeView();
         showFolderDialog();
         return;
     case RequestedPath::Target::Folder:
-        mArchiveList->refreshArchiveList(path);
+        m_archiveList->refreshArchiveList(path);
         break;
     case RequestedPath::Target::Title:
-        mArchiveList->refreshArchiveListInFile(requested.folder(), requested.fileName());
+        m_archiveList->refreshArchiveListInFile(requested.folder(), requested.fileName());
         break;
     case RequestedPath::Target::Outside:
         ConfinedPath::logRefusal(L"a request asks for what lies outside: ", path.toStdString());
@@ -387,26 +387,26 @@ void TitlerWindow::refreshArchiveList(QString path)
 
 void TitlerWindow::closeTitlerWindow()
 {
-    mArchiveList->stopArchiveListTapAndHoldTimer();
+    m_archiveList->stopArchiveListTapAndHoldTimer();
     if (archiveListIsMoveMode())
         slotCancelArchiveListMoveMode(); // a dragged title gets its place while the folder is still open
-    mArchiveList->slotHideOptionMenu();
-    const QString path = mArchiveList->getCurrentPath();
+    m_archiveList->slotHideOptionMenu();
+    const QString path = m_archiveList->getCurrentPath();
     saveCurrentTitle();
     clearUndoStack();
-    mTextToolsPanel->setSignalValue(false);
-    mArchiveList->synchronizationFolderFile();
-    mTextToolsPanel->initTextToolsPanel();
-    mLinks->editFolderEnds(path);
-    mToolsBar->resetToDefaultState();
+    m_textToolsPanel->setSignalValue(false);
+    m_archiveList->synchronizationFolderFile();
+    m_textToolsPanel->initTextToolsPanel();
+    m_links->editFolderEnds(path);
+    m_toolsBar->resetToDefaultState();
     resetCanvasBackground();
     waitUntilSaved();
-    if (mUnsavedWork.ask(*mLinks))
+    if (m_unsavedWork.ask(*m_links))
         return; // continueCloseTitler() is called with the answer
 
     EditContextController* context = EditContextController::getInstance();
-    if (mSessionEnd.asksFirst() && context->isMainNeedMsg()) {
-        mLinks->postMessage(MessageDef::MESSAGE_CONFIRM_CLOSE);
+    if (m_sessionEnd.asksFirst() && context->isMainNeedMsg()) {
+        m_links->postMessage(MessageDef::MESSAGE_CONFIRM_CLOSE);
         context->setITitlerNoCallBack();
         return;
     }
@@ -417,21 +417,21 @@ void TitlerWindow::resetCanvasBackground()
 {
     QAction checker(nullptr);
     checker.setData(CANVAS_CHECKER);
-    mCanvasScene->slotShowCanvasBG(&checker);
+    m_canvasScene->slotShowCanvasBG(&checker);
 }
 
 void TitlerWindow::closeTitlerMainWindow()
 {
-    const QString path = mArchiveList->getCurrentPath();
-    if (mSessionEnd.closesWindow())
+    const QString path = m_archiveList->getCurrentPath();
+    if (m_sessionEnd.closesWindow())
         close();
     else
         hideSession();
-    mDialogs->takeOpenedFromEditor();
-    mLinks->simpleCloseSoftKeyboard();
+    m_dialogs->takeOpenedFromEditor();
+    m_links->simpleCloseSoftKeyboard();
     EditContextController::getInstance()->sentITitlerCallBack(path.toStdWString());
     EditContextController::getInstance()->setITitlerNoCallBack();
-    mLinks->changeTopWindow(MessageDefine::TOP_WINDOW_MAIN);
+    m_links->changeTopWindow(MessageDefine::TOP_WINDOW_MAIN);
     // All files are renamed into place. Nobody waits for the disk to sync them; those that are not synced
     // after the deadline are only logged.
     QTimer::singleShot(SYNC_DEADLINE, this, &UnsavedWork::logUnsynced);
@@ -439,23 +439,23 @@ void TitlerWindow::closeTitlerMainWindow()
 
 void TitlerWindow::hideSession()
 {
-    mTemplatePicker->reject(); // the answer to a message may arrive while it is open
-    mFolderPicker->setCurrentFolderName(QString());
-    mToolsBar->hideCanvasMenu(); // the menu is a separate window
+    m_templatePicker->reject(); // the answer to a message may arrive while it is open
+    m_folderPicker->setCurrentFolderName(QString());
+    m_toolsBar->hideCanvasMenu(); // the menu is a separate window
     hide();
-    mCanvasScene->clearCanvas();
-    mArchiveList->cleanArchiveList();
-    mArchiveList->clearCopyArchive();
+    m_canvasScene->clearCanvas();
+    m_archiveList->cleanArchiveList();
+    m_archiveList->clearCopyArchive();
 }
 
 void TitlerWindow::continueCloseTitler(MessageDefine::tagCloseParam param)
 {
     if (isHidden() || param.messageId != MessageDef::MESSAGE_CONFIRM_CLOSE)
         return;
-    if (mUnsavedWork.takeQuestion()) {
+    if (m_unsavedWork.takeQuestion()) {
         if (param.closeType != MessageDefine::CLOSE_OK) {
             // The session continues, although the siblings were told that the folder is free.
-            mLinks->editFolderStarts(mArchiveList->getCurrentPath());
+            m_links->editFolderStarts(m_archiveList->getCurrentPath());
             return;
         }
         UnsavedWork::giveUp();
@@ -465,39 +465,39 @@ void TitlerWindow::continueCloseTitler(MessageDefine::tagCloseParam param)
 
 bool TitlerWindow::dataSaveIsFinished()
 {
-    return mCanvasScene->isEditFinish();
+    return m_canvasScene->isEditFinish();
 }
 
 void TitlerWindow::waitUntilSaved()
 {
     if (!dataSaveIsFinished()) {
         if (isVisible())
-            mSavingNotice->showAtOnce();
-        if (!mCanvasScene->waitForPictures())
+            m_savingNotice->showAtOnce();
+        if (!m_canvasScene->waitForPictures())
             LOG_DEBUG_OPERATE(L"TitlerWindow", LOG_NUMBER, L"pictures are still being written");
-        mSavingNotice->hide();
+        m_savingNotice->hide();
     }
     // The picture thread posts its reports to this thread. Deliver them now, before later messages and before
     // the process ends.
-    mLinks->sendTitleReports();
+    m_links->sendTitleReports();
 }
 
 void TitlerWindow::saveCurrentTitle()
 {
-    mGraphicsView->cancelTouch(); // a dragged object is saved at its old place
-    mCanvasScene->leaveTitle();
+    m_graphicsView->cancelTouch(); // a dragged object is saved at its old place
+    m_canvasScene->leaveTitle();
 }
 
 void TitlerWindow::endProcess()
 {
-    if (!mSessionEnd.beginEndOfProcess())
+    if (!m_sessionEnd.beginEndOfProcess())
         return;
-    mFolderPicker->done(QDialog::Rejected); // closes the dialog even if its Cancel is disabled
+    m_folderPicker->done(QDialog::Rejected); // closes the dialog even if its Cancel is disabled
     saveCurrentTitle();
     waitUntilSaved();
     UnsavedWork::giveUp();
     if (!KSInputContext::isSoftKeyboardClosed())
-        mLinks->simpleCloseSoftKeyboard(); // otherwise the keyboard stays open after the process has ended
+        m_links->simpleCloseSoftKeyboard(); // otherwise the keyboard stays open after the process has ended
     close();
     QApplication::closeAllWindows();
     QCoreApplication::quit();
@@ -507,79 +507,79 @@ void TitlerWindow::endProcess()
 
 void TitlerWindow::showFolderDialog()
 {
-    mDialogs->showFolderDialog();
+    m_dialogs->showFolderDialog();
 }
 
 void TitlerWindow::openFolderDialog()
 {
-    mArchiveList->stopArchiveListTapAndHoldTimer();
+    m_archiveList->stopArchiveListTapAndHoldTimer();
     if (isHidden())
         return;
-    mDialogs->noteOpenedFromEditor();
+    m_dialogs->noteOpenedFromEditor();
     hideSoftWareWithDeleteEmptyItems();
-    mCanvasScene->slotMakeSceneThumnail();
-    mFolderPicker->setCancelButtonEnabled(!mArchiveList->isEmpty());
-    mArchiveList->synchronizationFolderFile();
+    m_canvasScene->slotMakeSceneThumnail();
+    m_folderPicker->setCancelButtonEnabled(!m_archiveList->isEmpty());
+    m_archiveList->synchronizationFolderFile();
     clearUndoStack();
-    mFolderPicker->updateTreeView();
+    m_folderPicker->updateTreeView();
     markOpenFolder();
     showFolderDialog();
-    mToolsBar->setFolderButtonRest();
+    m_toolsBar->setFolderButtonRest();
 }
 
 // Marks the open folder in the picker: it cannot be renamed there, and renames by other processes are
 // followed.
 void TitlerWindow::markOpenFolder()
 {
-    mFolderPicker->setCurrentFolderName(
-        mArchiveList->getCurrentPath().section(QLatin1Char('/'), -1, -1, QString::SectionSkipEmpty));
+    m_folderPicker->setCurrentFolderName(
+        m_archiveList->getCurrentPath().section(QLatin1Char('/'), -1, -1, QString::SectionSkipEmpty));
 }
 
 void TitlerWindow::slotCancelClicked()
 {
-    if (!mDialogs->takeOpenedFromEditor()) {
-        if (mSessionEnd.closesWindow()) {
+    if (!m_dialogs->takeOpenedFromEditor()) {
+        if (m_sessionEnd.closesWindow()) {
             close();
         } else {
-            mFolderPicker->setCurrentFolderName(QString());
+            m_folderPicker->setCurrentFolderName(QString());
             hide();
-            mLinks->simpleCloseSoftKeyboard();
+            m_links->simpleCloseSoftKeyboard();
         }
     }
     if (WINDOW_IS_SHOWN)
         return;
     EditContextController::getInstance()->setITitlerNoCallBack();
-    mLinks->changeTopWindow(MessageDefine::TOP_WINDOW_MAIN);
-    mLinks->editFolderEnds(mArchiveList->getCurrentPath());
+    m_links->changeTopWindow(MessageDefine::TOP_WINDOW_MAIN);
+    m_links->editFolderEnds(m_archiveList->getCurrentPath());
 }
 
 void TitlerWindow::showTemplateDialog()
 {
-    mDialogs->showTemplateDialog();
+    m_dialogs->showTemplateDialog();
 }
 
 void TitlerWindow::showTemplateDialogOnUser()
 {
-    mTemplatePicker->showUserTemplateTab();
+    m_templatePicker->showUserTemplateTab();
     showTemplateDialog();
 }
 
 void TitlerWindow::slotStartCreateNewArchiveFromTemplate(Archive* archiveData)
 {
-    mArchiveList->createArchiveFromTemplate(archiveData);
-    mCanvasScene->createThumnailPicture();
+    m_archiveList->createArchiveFromTemplate(archiveData);
+    m_canvasScene->createThumnailPicture();
 }
 
 void TitlerWindow::slotShowDialogMaskWidget(bool isShow)
 {
     if (!isShow || WINDOW_IS_SHOWN)
-        mMasks->showDialogMaskWidget(isShow);
+        m_masks->showDialogMaskWidget(isShow);
 }
 
 void TitlerWindow::slotShowMessageMaskWidget(bool isShow)
 {
     if (!isShow || WINDOW_IS_SHOWN)
-        mMasks->showMessageMaskWidget(isShow);
+        m_masks->showMessageMaskWidget(isShow);
 }
 
 // --- Undo, and what the canvas and the list are asked for --------------------------------------------------
@@ -587,34 +587,34 @@ void TitlerWindow::slotShowMessageMaskWidget(bool isShow)
 // Drops a change of the selected title while the stack is clean, so that the stack stays clean.
 void TitlerWindow::pushUndoStack(QUndoCommand* subUndoCommand)
 {
-    if (mUndoStack.isClean() && subUndoCommand->id() == FOCUS_COMMAND_ID) {
+    if (m_undoStack.isClean() && subUndoCommand->id() == FOCUS_COMMAND_ID) {
         delete subUndoCommand;
         return;
     }
-    mUndoStack.push(subUndoCommand);
+    m_undoStack.push(subUndoCommand);
 }
 
 void TitlerWindow::clearUndoStack()
 {
-    mUndoStack.clear();
-    if (ArchiveItem* item = mArchiveList->getCurrentOperationArchive())
-        mArchiveList->clearOperationItemState(item);
+    m_undoStack.clear();
+    if (ArchiveItem* item = m_archiveList->getCurrentOperationArchive())
+        m_archiveList->clearOperationItemState(item);
 }
 
 void TitlerWindow::slotStartPasteArchive()
 {
-    mCanvasScene->createThumnailPicture();
+    m_canvasScene->createThumnailPicture();
 }
 
 void TitlerWindow::slotNewTextButtonClicked()
 {
-    mCanvasScene->slotInsertNewTextItem();
+    m_canvasScene->slotInsertNewTextItem();
 }
 
 void TitlerWindow::pressDelectButton()
 {
-    mCanvasScene->deleteSelectedItems();
-    mLinks->dummyCloseSoftKeyboard();
+    m_canvasScene->deleteSelectedItems();
+    m_links->dummyCloseSoftKeyboard();
 }
 
 // The checker pattern is part of the window's own picture behind the canvas.
@@ -625,26 +625,26 @@ void TitlerWindow::slotCanvasButtonClicked(QAction*)
 
 void TitlerWindow::setHasMessageToShowInformation(bool isNeedShow, QString defaultFont)
 {
-    mMissingFont = isNeedShow ? std::optional(std::move(defaultFont)) : std::nullopt;
+    m_missingFont = isNeedShow ? std::optional(std::move(defaultFont)) : std::nullopt;
 }
 
 // --- Leaving text editing --------------------------------------------------------------------------------
 
 void TitlerWindow::leaveTextEditing(bool deleteEmptyItems)
 {
-    const bool isEditing = mCanvasScene->itemIsEditorInteraction();
-    if (isEditing || mCanvasScene->itemIsSelectionMode()) {
+    const bool isEditing = m_canvasScene->itemIsEditorInteraction();
+    if (isEditing || m_canvasScene->itemIsSelectionMode()) {
         if (isEditing)
-            mCanvasScene->clearItemsSelectionAndFocus();
+            m_canvasScene->clearItemsSelectionAndFocus();
         else
-            mCanvasScene->clearItemsSelectionMode();
+            m_canvasScene->clearItemsSelectionMode();
         if (deleteEmptyItems)
             slotDeleteEmptyItems();
-        mCanvasScene->disableTextPropertyArea();
+        m_canvasScene->disableTextPropertyArea();
         if (isEditing && deleteEmptyItems)
             LOG_DEBUG_OPERATE(L"TitlerWindow", 200, L"hideSoftWareWithDeleteEmptyItems");
     }
-    mLinks->dummyCloseSoftKeyboard();
+    m_links->dummyCloseSoftKeyboard();
 }
 
 void TitlerWindow::slotDeleteEmptyItems()
@@ -652,22 +652,22 @@ void TitlerWindow::slotDeleteEmptyItems()
     // widgetAt() returns the viewport of a view, not the view itself. So a tap on the canvas beside an empty
     // text deletes the text.
     if (!qobject_cast<QGraphicsView*>(QApplication::widgetAt(QCursor::pos())))
-        mCanvasScene->slotDeleteEmptyItems();
+        m_canvasScene->slotDeleteEmptyItems();
 }
 
 // --- Move mode ------------------------------------------------------------------------------------------
 
 bool TitlerWindow::archiveListIsMoveMode() const
 {
-    return mMoveMode->isOn();
+    return m_moveMode->isOn();
 }
 
 void TitlerWindow::editAndDoneButtonClicked()
 {
     // Commits the input method's text before editing ends.
-    if (KSInputContext* context = mLinks->inputContext())
+    if (KSInputContext* context = m_links->inputContext())
         context->sendEvent(QInputMethodEvent());
-    KSPushbutton* button = mMoveMode->button();
+    KSPushbutton* button = m_moveMode->button();
     button->setStyleSheet(button->styleSheet());
     const bool on = !archiveListIsMoveMode();
     sendTransientControlEvent(on);
@@ -676,7 +676,7 @@ void TitlerWindow::editAndDoneButtonClicked()
 
 void TitlerWindow::changeMoveMode(bool on)
 {
-    mMoveMode->setOn(on);
+    m_moveMode->setOn(on);
     Q_EMIT moveButtonClicked(on);
 }
 
@@ -694,12 +694,12 @@ void TitlerWindow::slotCancelArchiveListMoveMode()
 
 void TitlerWindow::moveButtonPressed()
 {
-    mMoveMode->showPressed();
+    m_moveMode->showPressed();
 }
 
 void TitlerWindow::moveButtonReleased()
 {
-    mMoveMode->showReleased();
+    m_moveMode->showReleased();
 }
 
 // --- Lock reporting -------------------------------------------------------------------------------------
@@ -707,7 +707,7 @@ void TitlerWindow::moveButtonReleased()
 // Reports to the siblings that a control that closes on a press elsewhere was opened or closed.
 void TitlerWindow::sendTransientControlEvent(bool on)
 {
-    mLinks->sendAPPEvent(APPEventDefine::LOCKTYPE_OBJECT, on);
+    m_links->sendAPPEvent(APPEventDefine::LOCKTYPE_OBJECT, on);
 }
 
 void TitlerWindow::reportHiddenControl()
@@ -718,25 +718,25 @@ void TitlerWindow::reportHiddenControl()
 
 void TitlerWindow::slotHideEdgeSlider()
 {
-    mTextToolsPanel->hideEdgeSlider();
+    m_textToolsPanel->hideEdgeSlider();
     reportHiddenControl();
 }
 
 void TitlerWindow::slotHideCanvasMenu()
 {
-    mToolsBar->hideCanvasMenu();
+    m_toolsBar->hideCanvasMenu();
     reportHiddenControl();
 }
 
 void TitlerWindow::slotHideFontFamilyComboxList()
 {
-    mTextToolsPanel->hideFontFamilyComboxList();
+    m_textToolsPanel->hideFontFamilyComboxList();
     reportHiddenControl();
 }
 
 void TitlerWindow::slotHideFontSizeComboxList()
 {
-    mTextToolsPanel->hideFontSizeComboxList();
+    m_textToolsPanel->hideFontSizeComboxList();
     reportHiddenControl();
 }
 
@@ -744,43 +744,43 @@ void TitlerWindow::slotHideFontSizeComboxList()
 
 void TitlerWindow::slotSystemLanguageChanged(SystemSetupDef::emSystemLanguageType systemLanguage)
 {
-    if (mLanguage.switchTranslator(systemLanguage))
+    if (m_language.switchTranslator(systemLanguage))
         retranslateUI();
     useSpecifiedFont(WindowLanguage::fontFamily(systemLanguage));
-    mTemplatePicker->reloadTemplates(systemLanguage);
+    m_templatePicker->reloadTemplates(systemLanguage);
 }
 
 void TitlerWindow::slotInputLanguageChanged(SystemSetupDef::emInputLanguageType inputLanguage)
 {
-    mCanvasScene->slotSceneInputLanguageChanged(inputLanguage);
-    mTextToolsPanel->displayInputLanguage(inputLanguage);
+    m_canvasScene->slotSceneInputLanguageChanged(inputLanguage);
+    m_textToolsPanel->displayInputLanguage(inputLanguage);
 }
 
 void TitlerWindow::slotGetModuleInfo(SystemSetupDef::emInformationModel moduleInfo)
 {
     m_emModuleInfo = moduleInfo;
-    mCanvasScene->setModuleInfo(moduleInfo);
-    mTextToolsPanel->setModuleInfo(moduleInfo);
-    mTemplatePicker->setModuleInfo(moduleInfo);
+    m_canvasScene->setModuleInfo(moduleInfo);
+    m_textToolsPanel->setModuleInfo(moduleInfo);
+    m_templatePicker->setModuleInfo(moduleInfo);
 }
 
 void TitlerWindow::retranslateUI()
 {
     setWindowTitle(tr("Titler"));
-    mMoveMode->translateText();
-    mTextToolsPanel->translateText();
-    mToolsBar->translateText();
-    mFolderPicker->translateText();
-    mArchiveList->translateText();
-    mTemplatePicker->translateText();
+    m_moveMode->translateText();
+    m_textToolsPanel->translateText();
+    m_toolsBar->translateText();
+    m_folderPicker->translateText();
+    m_archiveList->translateText();
+    m_templatePicker->translateText();
 }
 
 void TitlerWindow::useSpecifiedFont(const QString& family)
 {
-    mFolderPicker->setSystemLanFont(QFont(family));
+    m_folderPicker->setSystemLanFont(QFont(family));
     setStyleSheet(QStringLiteral(" * {font-family:'%1';}").arg(family));
-    mArchiveList->setSystemLanFont(family);
-    mTemplatePicker->setSystemLanFont(QFont(family));
+    m_archiveList->setSystemLanFont(family);
+    m_templatePicker->setSystemLanFont(QFont(family));
 }
 
 void TitlerWindow::changeFontComboxItem(SystemSetupDef::emInformationModel moduleInfo)

@@ -84,7 +84,7 @@ public Q_SLOTS:
     void continueCloseTitler(MessageDefine::tagCloseParam param);
     void closeTitlerMainWindow();
     void slotPowerOff() { endProcess(); }
-    void setRealClose(bool realClose) { mSessionEnd.setQuits(realClose); }
+    void setRealClose(bool realClose) { m_sessionEnd.setQuits(realClose); }
     // Saves, waits until everything is written, and ends the event loop.
     void endProcess();
 
@@ -194,26 +194,26 @@ private:
     static bool WINDOW_IS_SHOWN;
 
     // Owned by their Qt parents.
-    ToolsBar* mToolsBar = nullptr;
-    CanvasScene* mCanvasScene = nullptr;
-    GraphicsView* mGraphicsView = nullptr;
-    ArchiveList* mArchiveList = nullptr;
-    TextToolsPanel* mTextToolsPanel = nullptr;
-    SavingNotice* mSavingNotice = nullptr;
-    FolderPicker* mFolderPicker = nullptr;
-    TemplatePicker* mTemplatePicker = nullptr;
+    ToolsBar* m_toolsBar = nullptr;
+    CanvasScene* m_canvasScene = nullptr;
+    GraphicsView* m_graphicsView = nullptr;
+    ArchiveList* m_archiveList = nullptr;
+    TextToolsPanel* m_textToolsPanel = nullptr;
+    SavingNotice* m_savingNotice = nullptr;
+    FolderPicker* m_folderPicker = nullptr;
+    TemplatePicker* m_templatePicker = nullptr;
 
-    QUndoStack mUndoStack;
-    std::unique_ptr<SiblingLinks> mLinks;
-    std::unique_ptr<MoveMode> mMoveMode;
-    std::unique_ptr<WindowMasks> mMasks;
-    std::unique_ptr<WindowDialogs> mDialogs;
-    WindowBackground mBackground;
-    WindowLanguage mLanguage;
+    QUndoStack m_undoStack;
+    std::unique_ptr<SiblingLinks> m_links;
+    std::unique_ptr<MoveMode> m_moveMode;
+    std::unique_ptr<WindowMasks> m_masks;
+    std::unique_ptr<WindowDialogs> m_dialogs;
+    WindowBackground m_background;
+    WindowLanguage m_language;
 
-    SessionEnd mSessionEnd;
-    UnsavedWork mUnsavedWork;
-    std::optional<QString> mMissingFont; // reported when the window is shown
+    SessionEnd m_sessionEnd;
+    UnsavedWork m_unsavedWork;
+    std::optional<QString> m_missingFont; // reported when the window is shown
     SystemSetupDef::emInformationModel m_emModuleInfo = SystemSetupDef::emInformationModelDefault;
 };
 

@@ -26,8 +26,8 @@ void TitlerWindow::connectWidget()
     connectForMainScene();
     connectForTextToolsAndArchiveList();
     connectForTextToolsPanel();
-    connect(mArchiveList, &ArchiveList::signalStartPasteArchive, this, &TitlerWindow::slotStartPasteArchive);
-    connect(this, &TitlerWindow::moveButtonClicked, mArchiveList, &ArchiveList::moveButtonClicked);
+    connect(m_archiveList, &ArchiveList::signalStartPasteArchive, this, &TitlerWindow::slotStartPasteArchive);
+    connect(this, &TitlerWindow::moveButtonClicked, m_archiveList, &ArchiveList::moveButtonClicked);
     connectForTemplates();
     connectForFolderPicker();
     connectForUndoRedoCommand();
@@ -35,123 +35,124 @@ void TitlerWindow::connectWidget()
 
 void TitlerWindow::connectForToolsBar()
 {
-    connect(mToolsBar, &ToolsBar::closeButtonClick, this, &TitlerWindow::closeTitlerWindow);
-    connect(mToolsBar, &ToolsBar::folderButtonClick, this, &TitlerWindow::openFolderDialog);
-    connect(mToolsBar, &ToolsBar::redoButtonClicked, this,
+    connect(m_toolsBar, &ToolsBar::closeButtonClick, this, &TitlerWindow::closeTitlerWindow);
+    connect(m_toolsBar, &ToolsBar::folderButtonClick, this, &TitlerWindow::openFolderDialog);
+    connect(m_toolsBar, &ToolsBar::redoButtonClicked, this,
             &TitlerWindow::hideSoftWareWithOutDeleteEmptyItems);
-    connect(mToolsBar, &ToolsBar::undoButtonClicked, this,
+    connect(m_toolsBar, &ToolsBar::undoButtonClicked, this,
             &TitlerWindow::hideSoftWareWithOutDeleteEmptyItems);
-    connect(mToolsBar, &ToolsBar::canvasButtonClicked, this, &TitlerWindow::slotCanvasButtonClicked);
-    connect(mToolsBar, &ToolsBar::newTextButtonClick, this, &TitlerWindow::slotNewTextButtonClicked);
-    connect(mToolsBar, &ToolsBar::deleteButtonClick, this, &TitlerWindow::pressDelectButton);
-    connect(mToolsBar, &ToolsBar::SafeAreaButtonClickedForDrawRect, mCanvasScene,
+    connect(m_toolsBar, &ToolsBar::canvasButtonClicked, this, &TitlerWindow::slotCanvasButtonClicked);
+    connect(m_toolsBar, &ToolsBar::newTextButtonClick, this, &TitlerWindow::slotNewTextButtonClicked);
+    connect(m_toolsBar, &ToolsBar::deleteButtonClick, this, &TitlerWindow::pressDelectButton);
+    connect(m_toolsBar, &ToolsBar::SafeAreaButtonClickedForDrawRect, m_canvasScene,
             &CanvasScene::slotDrawSafeArea);
-    connect(mToolsBar, &ToolsBar::canvasButtonClicked, mCanvasScene, &CanvasScene::slotShowCanvasBG);
+    connect(m_toolsBar, &ToolsBar::canvasButtonClicked, m_canvasScene, &CanvasScene::slotShowCanvasBG);
 }
 
 void TitlerWindow::connectForMainScene()
 {
-    connect(mCanvasScene, &CanvasScene::signalTextInserted, mToolsBar, &ToolsBar::setInsertUnchecked);
-    connect(mCanvasScene, &CanvasScene::signalSceneNotifyIfExistSelectedObject, mToolsBar,
+    connect(m_canvasScene, &CanvasScene::signalTextInserted, m_toolsBar, &ToolsBar::setInsertUnchecked);
+    connect(m_canvasScene, &CanvasScene::signalSceneNotifyIfExistSelectedObject, m_toolsBar,
             &ToolsBar::changeBtnStatus);
-    connect(mCanvasScene, &CanvasScene::signalDisableNewTextButton, mToolsBar,
+    connect(m_canvasScene, &CanvasScene::signalDisableNewTextButton, m_toolsBar,
             &ToolsBar::slotDisableNewTextButton);
-    connect(mCanvasScene, &CanvasScene::signalCanvasSceneMousePressed, mToolsBar,
+    connect(m_canvasScene, &CanvasScene::signalCanvasSceneMousePressed, m_toolsBar,
             &ToolsBar::slotlCanvasSceneMousePressed);
-    connect(mToolsBar, &ToolsBar::signalShowCanvasMenu, this, &TitlerWindow::slotShowCanvasMenu);
-    connect(mCanvasScene, &CanvasScene::signalHasMessageToShowInformation, this,
+    connect(m_toolsBar, &ToolsBar::signalShowCanvasMenu, this, &TitlerWindow::slotShowCanvasMenu);
+    connect(m_canvasScene, &CanvasScene::signalHasMessageToShowInformation, this,
             &TitlerWindow::setHasMessageToShowInformation);
-    connect(mCanvasScene, &CanvasScene::signalNewTextInsertedFailed, this,
+    connect(m_canvasScene, &CanvasScene::signalNewTextInsertedFailed, this,
             &TitlerWindow::hideSoftWareWithDeleteEmptyItems);
-    connect(mCanvasScene, &CanvasScene::signalSaveOk, mArchiveList, &ArchiveList::refreshBaseItem);
-    connect(mCanvasScene, &CanvasScene::signalStartEditTextItem, mArchiveList,
+    connect(m_canvasScene, &CanvasScene::signalSaveOk, m_archiveList, &ArchiveList::refreshBaseItem);
+    connect(m_canvasScene, &CanvasScene::signalStartEditTextItem, m_archiveList,
             &ArchiveList::moveCurrentArchiveItemVisble);
 }
 
 void TitlerWindow::connectForTextToolsAndArchiveList()
 {
-    connect(mArchiveList, &ArchiveList::signalUpdateCanvas, mCanvasScene, &CanvasScene::slotUpdateArchive);
-    connect(mArchiveList, &ArchiveList::itemSetDefaultState, mCanvasScene,
+    connect(m_archiveList, &ArchiveList::signalUpdateCanvas, m_canvasScene, &CanvasScene::slotUpdateArchive);
+    connect(m_archiveList, &ArchiveList::itemSetDefaultState, m_canvasScene,
             &CanvasScene::slotMakeSceneThumnail);
-    connect(mArchiveList, &ArchiveList::startTemplatePicker, this, &TitlerWindow::showTemplateDialog);
-    connect(mArchiveList, &ArchiveList::startUserTemplatePicker, this,
+    connect(m_archiveList, &ArchiveList::startTemplatePicker, this, &TitlerWindow::showTemplateDialog);
+    connect(m_archiveList, &ArchiveList::startUserTemplatePicker, this,
             &TitlerWindow::showTemplateDialogOnUser);
-    connect(mArchiveList, &ArchiveList::cleanUndoStack, this, &TitlerWindow::clearUndoStack);
-    connect(mArchiveList, &ArchiveList::archiveListMenuShow, this,
+    connect(m_archiveList, &ArchiveList::cleanUndoStack, this, &TitlerWindow::clearUndoStack);
+    connect(m_archiveList, &ArchiveList::archiveListMenuShow, this,
             &TitlerWindow::hideSoftWareWithDeleteEmptyItems);
-    connect(mArchiveList, &ArchiveList::widgetItemReleased, this, &TitlerWindow::listWidgetReleasedEvent);
-    connect(mMoveMode->button(), &QPushButton::clicked, this,
+    connect(m_archiveList, &ArchiveList::widgetItemReleased, this, &TitlerWindow::listWidgetReleasedEvent);
+    connect(m_moveMode->button(), &QPushButton::clicked, this,
             &TitlerWindow::hideSoftWareWithDeleteEmptyItems);
 }
 
 void TitlerWindow::connectForTextToolsPanel()
 {
     // The selection is shown in the panel.
-    connect(mCanvasScene, &CanvasScene::signalSceneNotifyIfExistSelectedObject, mTextToolsPanel,
+    connect(m_canvasScene, &CanvasScene::signalSceneNotifyIfExistSelectedObject, m_textToolsPanel,
             &TextToolsPanel::changeFontPropertyBtnStatus);
-    connect(mCanvasScene, &CanvasScene::signalNotifyPropertyAreaUpdateCurrentTextStyle, mTextToolsPanel,
+    connect(m_canvasScene, &CanvasScene::signalNotifyPropertyAreaUpdateCurrentTextStyle, m_textToolsPanel,
             &TextToolsPanel::updateTextStyle);
-    connect(mCanvasScene, &CanvasScene::signalSceneNotifyTextPropertyAreaObjectSelectionMode, mTextToolsPanel,
-            &TextToolsPanel::selectionModeForShadowAndAlign);
-    connect(mCanvasScene, &CanvasScene::signalBeginNewTextItem, mTextToolsPanel,
+    connect(m_canvasScene, &CanvasScene::signalSceneNotifyTextPropertyAreaObjectSelectionMode,
+            m_textToolsPanel, &TextToolsPanel::selectionModeForShadowAndAlign);
+    connect(m_canvasScene, &CanvasScene::signalBeginNewTextItem, m_textToolsPanel,
             &TextToolsPanel::slotBeginNewTextItem);
-    connect(mCanvasScene, &CanvasScene::signalSceneSoftWareClosedWhenEditObject, mTextToolsPanel,
+    connect(m_canvasScene, &CanvasScene::signalSceneSoftWareClosedWhenEditObject, m_textToolsPanel,
             &TextToolsPanel::slotHideColorPaletteWhenCloseSoftWare);
-    connect(mCanvasScene, &CanvasScene::signalEndPreview, mTextToolsPanel, &TextToolsPanel::slotEndPreview);
+    connect(m_canvasScene, &CanvasScene::signalEndPreview, m_textToolsPanel, &TextToolsPanel::slotEndPreview);
     // Changes in the panel are sent to the canvas.
-    connect(mTextToolsPanel, &TextToolsPanel::signalNotifyEditAreaSizeToolBoxEditDone, mCanvasScene,
+    connect(m_textToolsPanel, &TextToolsPanel::signalNotifyEditAreaSizeToolBoxEditDone, m_canvasScene,
             &CanvasScene::slotNotifyEditAreaSizeToolBoxEditDone);
-    connect(mTextToolsPanel, &TextToolsPanel::textStyleChange, mCanvasScene,
+    connect(m_textToolsPanel, &TextToolsPanel::textStyleChange, m_canvasScene,
             &CanvasScene::slotChangeObjectTextStyle);
-    connect(mTextToolsPanel, &TextToolsPanel::signalUpdateCurrentTextProperty, mCanvasScene,
+    connect(m_textToolsPanel, &TextToolsPanel::signalUpdateCurrentTextProperty, m_canvasScene,
             &CanvasScene::slotUpdateCurrentTextProperty);
     // Transient controls, fonts and positions.
-    connect(mTextToolsPanel, &TextToolsPanel::signalShowEdgeSlider, this, &TitlerWindow::slotShowEdgeSlider);
-    connect(mToolsBar, &ToolsBar::signalShowCanvasMenu, mTextToolsPanel,
+    connect(m_textToolsPanel, &TextToolsPanel::signalShowEdgeSlider, this, &TitlerWindow::slotShowEdgeSlider);
+    connect(m_toolsBar, &ToolsBar::signalShowCanvasMenu, m_textToolsPanel,
             &TextToolsPanel::slotAbsoluteShowCanvasMenu);
-    connect(mTextToolsPanel, &TextToolsPanel::signalShowFontFamilyComboxList, this,
+    connect(m_textToolsPanel, &TextToolsPanel::signalShowFontFamilyComboxList, this,
             &TitlerWindow::slotShowFontFamilyComboxList);
-    connect(mTextToolsPanel, &TextToolsPanel::signalShowFontSizeComboxList, this,
+    connect(m_textToolsPanel, &TextToolsPanel::signalShowFontSizeComboxList, this,
             &TitlerWindow::slotShowFontSizeComboxList);
-    connect(this, &TitlerWindow::modifyFontComboxItem, mTextToolsPanel,
+    connect(this, &TitlerWindow::modifyFontComboxItem, m_textToolsPanel,
             &TextToolsPanel::modifyFontFamilyComboxItem);
-    connect(this, &TitlerWindow::titlerWindowGeometry, mTextToolsPanel,
+    connect(this, &TitlerWindow::titlerWindowGeometry, m_textToolsPanel,
             &TextToolsPanel::titlerWindowRectSlot);
 }
 
 void TitlerWindow::connectForTemplates()
 {
-    connect(mTemplatePicker, &TemplatePicker::selectedTemplate, this,
+    connect(m_templatePicker, &TemplatePicker::selectedTemplate, this,
             &TitlerWindow::slotStartCreateNewArchiveFromTemplate);
-    connect(mTemplatePicker, &TemplatePicker::signalCloseSoftwareKeyBoardForFileManager, mFolderPicker,
+    connect(m_templatePicker, &TemplatePicker::signalCloseSoftwareKeyBoardForFileManager, m_folderPicker,
             &FolderPicker::slotCloseSoftwareKeyBoardForFileManager);
-    connect(mArchiveList, &ArchiveList::addUserSignal, mTemplatePicker, &TemplatePicker::slotSaveAsTemplate);
+    connect(m_archiveList, &ArchiveList::addUserSignal, m_templatePicker,
+            &TemplatePicker::slotSaveAsTemplate);
 }
 
 void TitlerWindow::connectForFolderPicker()
 {
-    connect(mFolderPicker, &FolderPicker::clearUndoCommandStack, this, &TitlerWindow::clearUndoStack);
-    connect(mFolderPicker, &FolderPicker::signalCancelClicked, this, &TitlerWindow::slotCancelClicked);
-    connect(mFolderPicker, &FolderPicker::changeFolderPath, mArchiveList, &ArchiveList::refreshArchiveList);
-    connect(mFolderPicker, &FolderPicker::changeFolderFile, mArchiveList,
+    connect(m_folderPicker, &FolderPicker::clearUndoCommandStack, this, &TitlerWindow::clearUndoStack);
+    connect(m_folderPicker, &FolderPicker::signalCancelClicked, this, &TitlerWindow::slotCancelClicked);
+    connect(m_folderPicker, &FolderPicker::changeFolderPath, m_archiveList, &ArchiveList::refreshArchiveList);
+    connect(m_folderPicker, &FolderPicker::changeFolderFile, m_archiveList,
             &ArchiveList::refreshArchiveListInFile);
-    connect(mFolderPicker, &FolderPicker::folderNameChange, mArchiveList,
+    connect(m_folderPicker, &FolderPicker::folderNameChange, m_archiveList,
             &ArchiveList::refreshArchiveListForChangeFolderName);
-    connect(mFolderPicker, &FolderPicker::folderMoved, mCanvasScene, &CanvasScene::folderRenamed);
+    connect(m_folderPicker, &FolderPicker::folderMoved, m_canvasScene, &CanvasScene::folderRenamed);
 }
 
 void TitlerWindow::connectForUndoRedoCommand()
 {
-    connect(mArchiveList, &ArchiveList::deleteCommandSignal, this, &TitlerWindow::pushUndoStack);
-    connect(mArchiveList, &ArchiveList::pasteCommandSignal, this, &TitlerWindow::pushUndoStack);
-    connect(mArchiveList, &ArchiveList::focusCommandSignal, this, &TitlerWindow::pushUndoStack);
-    connect(mArchiveList, &ArchiveList::moveCommandSignal, this, &TitlerWindow::pushUndoStack);
-    connect(mCanvasScene, &CanvasScene::signalPushUndoCommandIntoStack, this, &TitlerWindow::pushUndoStack);
+    connect(m_archiveList, &ArchiveList::deleteCommandSignal, this, &TitlerWindow::pushUndoStack);
+    connect(m_archiveList, &ArchiveList::pasteCommandSignal, this, &TitlerWindow::pushUndoStack);
+    connect(m_archiveList, &ArchiveList::focusCommandSignal, this, &TitlerWindow::pushUndoStack);
+    connect(m_archiveList, &ArchiveList::moveCommandSignal, this, &TitlerWindow::pushUndoStack);
+    connect(m_canvasScene, &CanvasScene::signalPushUndoCommandIntoStack, this, &TitlerWindow::pushUndoStack);
 }
 
 void TitlerWindow::connectForController()
 {
-    if (!mLinks->areMade())
+    if (!m_links->areMade())
         return;
     connect(ShowTitlerController::getInstance(), &ShowTitlerController::signalShowTitlerParameter, this,
             &TitlerWindow::showTitlerWindow);
@@ -167,7 +168,7 @@ void TitlerWindow::connectForController()
             &TitlerWindow::slotPowerOff);
     connectForRestoreOriginal();
     connect(EditTitlerController::getInstance(), &EditTitlerController::importNewFontFamilies,
-            mTextToolsPanel, &TextToolsPanel::slotImportNewFontFamlies);
+            m_textToolsPanel, &TextToolsPanel::slotImportNewFontFamlies);
     connectForFolderNotices();
     connect(MessageBoxController::getInstance(), &MessageBoxController::signalCloseMessage, this,
             &TitlerWindow::continueCloseTitler);
@@ -193,19 +194,19 @@ void TitlerWindow::connectForRestoreOriginal()
 void TitlerWindow::connectForFolderNotices()
 {
     const auto* fileManager = EditTitlerController::getInstance();
-    connect(fileManager, &EditTitlerController::folderNameChangeFromFileManager, mFolderPicker,
+    connect(fileManager, &EditTitlerController::folderNameChangeFromFileManager, m_folderPicker,
             &FolderPicker::folderNameChanged);
-    connect(fileManager, &EditTitlerController::folderDeleteFromFileManager, mFolderPicker,
+    connect(fileManager, &EditTitlerController::folderDeleteFromFileManager, m_folderPicker,
             &FolderPicker::slotDeleteFolder);
 }
 
 void TitlerWindow::connectForTemplateNotices()
 {
     const auto* fileManager = EditTitlerController::getInstance();
-    connect(fileManager, &EditTitlerController::importNewUserTemplate, mTemplatePicker,
+    connect(fileManager, &EditTitlerController::importNewUserTemplate, m_templatePicker,
             &TemplatePicker::slotImportNewUserTemplate);
-    connect(fileManager, &EditTitlerController::deleteUserTemplate, mTemplatePicker,
+    connect(fileManager, &EditTitlerController::deleteUserTemplate, m_templatePicker,
             &TemplatePicker::slotDeleteUserTemplate);
-    connect(fileManager, &EditTitlerController::renameUserTemplate, mTemplatePicker,
+    connect(fileManager, &EditTitlerController::renameUserTemplate, m_templatePicker,
             &TemplatePicker::slotRenameUserTemplate);
 }

@@ -56,7 +56,7 @@ QString asideOf(const QString& path)
 
 } // namespace
 
-TitlerProvision::TitlerProvision(QString basePath) : mBase(std::move(basePath))
+TitlerProvision::TitlerProvision(QString basePath) : m_base(std::move(basePath))
 {
 }
 
@@ -77,12 +77,12 @@ QString TitlerProvision::basePathOfEnvironment()
 
 bool TitlerProvision::writeMissing()
 {
-    return makeFolder(mBase) && writePathFile() && writeCheckers() && writeTemplates() && writeTitles();
+    return makeFolder(m_base) && writePathFile() && writeCheckers() && writeTemplates() && writeTitles();
 }
 
 bool TitlerProvision::writePathFile()
 {
-    const QString path = mBase + QStringLiteral("PathInfo.xml");
+    const QString path = m_base + QStringLiteral("PathInfo.xml");
     if (QFileInfo::exists(path))
         return true;
     QSaveFile file(path);
@@ -102,7 +102,7 @@ bool TitlerProvision::writePathFile()
 
 bool TitlerProvision::writeCheckers()
 {
-    const QString folder = mBase + QLatin1String(TEMPLATES);
+    const QString folder = m_base + QLatin1String(TEMPLATES);
     if (!makeFolder(folder))
         return false;
     for (const QSize& size : {QSize(240, 135), QSize(135, 135)}) {
@@ -116,7 +116,7 @@ bool TitlerProvision::writeCheckers()
 
 bool TitlerProvision::writeTemplates()
 {
-    const QString root = mBase + QLatin1String(TEMPLATES);
+    const QString root = m_base + QLatin1String(TEMPLATES);
     ThumbnailRender render;
     return writeTemplateSet(render, root + QStringLiteral("/templates_en"), false) &&
            writeTemplateSet(render, root + QStringLiteral("/templates_chs"), true);
@@ -127,7 +127,7 @@ bool TitlerProvision::writeTemplateSet(ThumbnailRender& render, const QString& f
     if (QFileInfo::exists(folder))
         return true;
     // Titles name preset backgrounds by absolute paths, so these are written to their final folder at once.
-    const QString backgrounds = mBase + QLatin1String(TEMPLATES) + QStringLiteral("/backgrounds");
+    const QString backgrounds = m_base + QLatin1String(TEMPLATES) + QStringLiteral("/backgrounds");
     std::vector<SampleTitles::Sample> samples = PresetTemplates::samples(chinese);
     return makeFolder(backgrounds) && writeFolder(render, folder, samples, backgrounds);
 }
@@ -136,7 +136,7 @@ bool TitlerProvision::writeTitles()
 {
     // Samples are only written to a new data path: once the folder of titles exists, deleted samples must not
     // come back.
-    const QString root = mBase + QLatin1String(TITLES);
+    const QString root = m_base + QLatin1String(TITLES);
     if (QFileInfo::exists(root))
         return true;
     const QString aside = asideOf(root);
@@ -236,6 +236,6 @@ bool TitlerProvision::moveIntoPlace(const QString& from, const QString& to)
 
 bool TitlerProvision::fail(const QString& what)
 {
-    mError = what;
+    m_error = what;
     return false;
 }

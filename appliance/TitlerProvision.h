@@ -25,7 +25,7 @@ public:
 
     // Returns whether everything is present afterwards; otherwise error() returns the reason.
     bool writeMissing();
-    QString error() const { return mError; }
+    QString error() const { return m_error; }
 
 private:
     bool writePathFile();
@@ -42,6 +42,6 @@ private:
     bool moveIntoPlace(const QString& from, const QString& to);
     bool fail(const QString& what);
 
-    QString mBase;
-    QString mError;
+    QString m_base;
+    QString m_error;
 };

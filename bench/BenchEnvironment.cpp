@@ -41,8 +41,8 @@ BenchEnvironment::BenchEnvironment()
 
 QString BenchEnvironment::makeFolder(const QString& name) const
 {
-    QDir(mFolder.path()).mkpath(name);
-    return mFolder.filePath(name);
+    QDir(m_folder.path()).mkpath(name);
+    return m_folder.filePath(name);
 }
 
 QString BenchEnvironment::binaryFolder()

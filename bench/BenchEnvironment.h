@@ -12,7 +12,7 @@ public:
     // before anything of the program is used.
     BenchEnvironment();
 
-    bool isValid() const { return mFolder.isValid(); }
+    bool isValid() const { return m_folder.isValid(); }
     // Creates an empty folder of this name in the temporary folder. The path ends without "/".
     QString makeFolder(const QString& name) const;
 
@@ -20,5 +20,5 @@ public:
     static QString binaryFolder();
 
 private:
-    QTemporaryDir mFolder;
+    QTemporaryDir m_folder;
 };

@@ -89,8 +89,8 @@ int CallPeer::run()
 {
     auto adapter = std::make_unique<TitlerAdapter>(TitlerAdapter::INTERFACE_ID);
     adapter->setTarget(this);
-    adapter->setProxyFactory(&mFactory);
-    if (!mFactory.listen(CallFactory::PEER, adapter.release(), false))
+    adapter->setProxyFactory(&m_factory);
+    if (!m_factory.listen(CallFactory::PEER, adapter.release(), false))
         return 1;
     announceReady();
     return QCoreApplication::exec();
@@ -98,16 +98,16 @@ int CallPeer::run()
 
 void CallPeer::registerCallBack(ITitlerCallBack* callBack)
 {
-    mCallBack.reset(callBack);
+    m_callBack.reset(callBack);
 }
 
 void CallPeer::showTitlerCreate(_CALL_TITLER_TYPE type)
 {
-    if (!mCallBack)
+    if (!m_callBack)
         return;
     _CALLBACK_TITLER_PARAMTER result;
     result.type = type;
-    mCallBack->finishTitlerCreateCallback(result);
+    m_callBack->finishTitlerCreateCallback(result);
 }
 
 void CallPeer::showTitlerEdit(_SHOW_TITLER_PARAMTER)

@@ -49,8 +49,8 @@ public:
     void showMessageMaskWidget(bool show) override;
 
 private:
-    CallFactory mFactory;
-    std::unique_ptr<ITitlerCallBack> mCallBack;
+    CallFactory m_factory;
+    std::unique_ptr<ITitlerCallBack> m_callBack;
 };
 
 // Receives whole frames on one socket, acknowledges each and sends it back: measures the wire without the

@@ -27,13 +27,13 @@ void addChunk(QByteArray& bytes, const char* type, const QByteArray& data)
 
 } // namespace
 
-FastPng::FastPng() : mCompressor(libdeflate_alloc_compressor(FASTEST))
+FastPng::FastPng() : m_compressor(libdeflate_alloc_compressor(FASTEST))
 {
 }
 
 FastPng::~FastPng()
 {
-    libdeflate_free_compressor(mCompressor);
+    libdeflate_free_compressor(m_compressor);
 }
 
 QByteArray FastPng::encode(const QImage& image, Filter filter)
@@ -43,8 +43,8 @@ QByteArray FastPng::encode(const QImage& image, Filter filter)
         image.convertToFormat(alpha ? QImage::Format_RGBA8888 : QImage::Format_RGB888);
     const auto lineSize = static_cast<std::size_t>(image.width()) * (alpha ? 4 : 3);
     const auto size = (lineSize + 1) * static_cast<std::size_t>(image.height());
-    mLines.resize(static_cast<qsizetype>(size));
-    auto* out = reinterpret_cast<uchar*>(mLines.data());
+    m_lines.resize(static_cast<qsizetype>(size));
+    auto* out = reinterpret_cast<uchar*>(m_lines.data());
     for (int y = 0; y < image.height(); ++y) {
         const uchar* line = bytesOrdered.constScanLine(y);
         const bool up = filter == Filter::Up && y > 0;
@@ -58,16 +58,16 @@ QByteArray FastPng::encode(const QImage& image, Filter filter)
         }
         out += lineSize;
     }
-    mPacked.resize(static_cast<qsizetype>(libdeflate_zlib_compress_bound(mCompressor, size)));
-    const std::size_t packed = libdeflate_zlib_compress(mCompressor, mLines.constData(), size, mPacked.data(),
-                                                        static_cast<std::size_t>(mPacked.size()));
+    m_packed.resize(static_cast<qsizetype>(libdeflate_zlib_compress_bound(m_compressor, size)));
+    const std::size_t packed = libdeflate_zlib_compress(
+        m_compressor, m_lines.constData(), size, m_packed.data(), static_cast<std::size_t>(m_packed.size()));
     QByteArray header;
     addNumber(header, static_cast<quint32>(image.width()));
     addNumber(header, static_cast<quint32>(image.height()));
     header.append(char(8)).append(char(alpha ? 6 : 2)).append(3, char(0));
     QByteArray bytes("\x89PNG\r\n\x1a\n", 8);
     addChunk(bytes, "IHDR", header);
-    addChunk(bytes, "IDAT", QByteArray::fromRawData(mPacked.constData(), static_cast<qsizetype>(packed)));
+    addChunk(bytes, "IDAT", QByteArray::fromRawData(m_packed.constData(), static_cast<qsizetype>(packed)));
     addChunk(bytes, "IEND", {});
     return bytes;
 }

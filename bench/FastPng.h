@@ -22,7 +22,7 @@ public:
     QByteArray encode(const QImage& image, Filter filter);
 
 private:
-    libdeflate_compressor* mCompressor;
-    QByteArray mLines;
-    QByteArray mPacked;
+    libdeflate_compressor* m_compressor;
+    QByteArray m_lines;
+    QByteArray m_packed;
 };

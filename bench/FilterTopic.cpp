@@ -17,17 +17,17 @@ constexpr double AIM = 1.05;
 class Target : public QWidget
 {
 public:
-    long arrived() const { return mArrived; }
+    long arrived() const { return m_arrived; }
 
 protected:
     void mouseMoveEvent(QMouseEvent* event) override
     {
-        ++mArrived;
+        ++m_arrived;
         event->accept();
     }
 
 private:
-    long mArrived = 0;
+    long m_arrived = 0;
 };
 
 // Sends mouse moves, which are the most frequent events that are neither touches nor keys.

@@ -218,21 +218,21 @@ void renderTitle(benchmark::State& state, const BenchEnvironment& environment)
 class FirstScreen : public QObject
 {
 public:
-    explicit FirstScreen(ArchiveList& list) : mList(list) { list.viewport()->installEventFilter(this); }
-    bool isPainting() const { return mIsPainting; }
-    void begin() { mIsPainting = false; }
+    explicit FirstScreen(ArchiveList& list) : m_list(list) { list.viewport()->installEventFilter(this); }
+    bool isPainting() const { return m_isPainting; }
+    void begin() { m_isPainting = false; }
 
     bool eventFilter(QObject* object, QEvent* event) override
     {
-        const ArchiveItem* last = mList.archiveItem(mList.lastVisibleItem());
-        if (object == mList.viewport() && event->type() == QEvent::Paint)
-            mIsPainting = last && last->hasChildWidgets();
+        const ArchiveItem* last = m_list.archiveItem(m_list.lastVisibleItem());
+        if (object == m_list.viewport() && event->type() == QEvent::Paint)
+            m_isPainting = last && last->hasChildWidgets();
         return false;
     }
 
 private:
-    ArchiveList& mList;
-    bool mIsPainting = false;
+    ArchiveList& m_list;
+    bool m_isPainting = false;
 };
 
 void closeFolder(ShownList& shown)

@@ -26,19 +26,19 @@ constexpr long ANSWER_ADAPTER = 7;
 class AnswerAdapter : public PTC::CallbackAdapter
 {
 public:
-    explicit AnswerAdapter(long& answers) : PTC::CallbackAdapter(ANSWER_ADAPTER), mAnswers(answers) {}
+    explicit AnswerAdapter(long& answers) : PTC::CallbackAdapter(ANSWER_ADAPTER), m_answers(answers) {}
 
     void receive(PTC::Event* event) override
     {
         _CALLBACK_TITLER_PARAMTER result;
         TitlerParams::deserialize_finishTitlerCreateCallback_param(result, event->getData(),
                                                                    event->getSize());
-        ++mAnswers;
+        ++m_answers;
     }
     void setTarget(void*) override {}
 
 private:
-    long& mAnswers;
+    long& m_answers;
 };
 
 void callAndAnswer(benchmark::State& state)

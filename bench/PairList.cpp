@@ -11,5 +11,5 @@ void PairList::add(const Pair& pair, benchmark::TimeUnit unit, const Body& ours,
     };
     enter("/ours", ours);
     enter("/floor", floor);
-    mPairs.push_back(pair);
+    m_pairs.push_back(pair);
 }

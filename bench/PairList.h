@@ -28,8 +28,8 @@ public:
     // Registers "<name>/ours" and "<name>/floor". The bodies run in the main thread.
     void add(const Pair& pair, benchmark::TimeUnit unit, const Body& ours, const Body& floor);
 
-    const std::vector<Pair>& pairs() const { return mPairs; }
+    const std::vector<Pair>& pairs() const { return m_pairs; }
 
 private:
-    std::vector<Pair> mPairs;
+    std::vector<Pair> m_pairs;
 };

@@ -21,7 +21,7 @@ double median(std::vector<double> values)
 
 } // namespace
 
-PairReporter::PairReporter(const PairList& pairs) : ConsoleReporter(OO_Tabular), mPairs(pairs)
+PairReporter::PairReporter(const PairList& pairs) : ConsoleReporter(OO_Tabular), m_pairs(pairs)
 {
 }
 
@@ -29,9 +29,9 @@ void PairReporter::ReportRuns(const std::vector<Run>& runs)
 {
     for (const Run& run : runs) {
         if (run.error_occurred) {
-            mFailed = true;
+            m_failed = true;
         } else if (run.run_type == Run::RT_Iteration && run.iterations > 0) {
-            Times& times = mTimes[run.run_name.function_name];
+            Times& times = m_times[run.run_name.function_name];
             const auto iterations = static_cast<double>(run.iterations);
             times.cpu.push_back(run.cpu_accumulated_time / iterations);
             times.wall.push_back(run.real_accumulated_time / iterations);
@@ -48,8 +48,8 @@ void PairReporter::ReportRuns(const std::vector<Run>& runs)
 
 double PairReporter::timeOf(const std::string& name, PairList::Clock clock) const
 {
-    const auto found = mTimes.find(name);
-    if (found == mTimes.end())
+    const auto found = m_times.find(name);
+    if (found == m_times.end())
         return 0;
     return median(clock == PairList::Clock::Cpu ? found->second.cpu : found->second.wall);
 }
@@ -62,7 +62,7 @@ void PairReporter::Finalize()
         << "ours [ms]" << std::setw(NUMBER_WIDTH) << "floor [ms]" << std::setw(NUMBER_WIDTH) << "ratio"
         << std::setw(NUMBER_WIDTH) << "aim"
         << "\n";
-    for (const PairList::Pair& pair : mPairs.pairs())
+    for (const PairList::Pair& pair : m_pairs.pairs())
         printPair(pair);
     out << std::flush;
 }
@@ -78,7 +78,7 @@ void PairReporter::printPair(const PairList::Pair& pair)
     const bool inTime = pair.limit <= 0 || ours * MILLISECONDS <= pair.limit;
     const bool reached = ratio <= pair.aim && inTime;
     if (!reached)
-        ++mMissed;
+        ++m_missed;
     GetOutputStream() << std::left << std::setw(NAME_WIDTH) << pair.name << std::right << std::fixed
                       << std::setw(NUMBER_WIDTH) << std::setprecision(4) << ours * MILLISECONDS
                       << std::setw(NUMBER_WIDTH) << floor * MILLISECONDS << std::setprecision(2)

@@ -14,8 +14,8 @@ public:
     void Finalize() override;
 
     // Return whether a benchmark has reported an error, and how many pairs have missed their aim.
-    bool failed() const { return mFailed; }
-    int missed() const { return mMissed; }
+    bool failed() const { return m_failed; }
+    int missed() const { return m_missed; }
 
 private:
     struct Times {
@@ -27,8 +27,8 @@ private:
     double timeOf(const std::string& name, PairList::Clock clock) const;
     void printPair(const PairList::Pair& pair);
 
-    const PairList& mPairs;
-    std::map<std::string, Times> mTimes;
-    bool mFailed = false;
-    int mMissed = 0;
+    const PairList& m_pairs;
+    std::map<std::string, Times> m_times;
+    bool m_failed = false;
+    int m_missed = 0;
 };

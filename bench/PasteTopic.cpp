@@ -73,16 +73,16 @@ class PictureCount : public ITitleChangeReporter
 public:
     PictureCount() { ITitleChangeReporter::setInstance(this); }
     ~PictureCount() override { ITitleChangeReporter::setInstance(nullptr); }
-    int count() const { return mCount; }
+    int count() const { return m_count; }
 
     void changeTitlerStatus(FileManagerDefine::emTITLECHANGE_TYPE change, QString) override
     {
         if (change == FileManagerDefine::TITLE_PICTURES_CHANGED)
-            ++mCount;
+            ++m_count;
     }
 
 private:
-    std::atomic<int> mCount = 0;
+    std::atomic<int> m_count = 0;
 };
 
 // Calls, then runs the event loop until everything that follows is painted and the pictures of one title are

@@ -6,7 +6,7 @@
 class PathRecorder::Engine : public QPaintEngine
 {
 public:
-    explicit Engine(PathRecorder& recorder) : QPaintEngine(AllFeatures), mRecorder(recorder) {}
+    explicit Engine(PathRecorder& recorder) : QPaintEngine(AllFeatures), m_recorder(recorder) {}
 
     bool begin(QPaintDevice*) override { return true; }
     bool end() override { return true; }
@@ -16,34 +16,34 @@ public:
     {
         const DirtyFlags flags = changed.state();
         if (flags & DirtyTransform)
-            mTransform = changed.transform();
+            m_transform = changed.transform();
         if (flags & DirtyBrush)
-            mBrush = changed.brush();
+            m_brush = changed.brush();
         if (flags & DirtyPen)
-            mPen = changed.pen();
+            m_pen = changed.pen();
     }
 
     void drawPath(const QPainterPath& path) override
     {
-        if (mPen.style() != Qt::NoPen || mBrush.style() != Qt::SolidPattern ||
-            mTransform.type() > QTransform::TxTranslate)
-            mRecorder.mComplete = false;
-        mRecorder.mPaths.push_back({path, QPointF(mTransform.dx(), mTransform.dy()), mBrush.color()});
+        if (m_pen.style() != Qt::NoPen || m_brush.style() != Qt::SolidPattern ||
+            m_transform.type() > QTransform::TxTranslate)
+            m_recorder.m_complete = false;
+        m_recorder.m_paths.push_back({path, QPointF(m_transform.dx(), m_transform.dy()), m_brush.color()});
     }
 
     using QPaintEngine::drawPolygon;
-    void drawPixmap(const QRectF&, const QPixmap&, const QRectF&) override { mRecorder.mComplete = false; }
-    void drawPolygon(const QPointF*, int, PolygonDrawMode) override { mRecorder.mComplete = false; }
-    void drawTextItem(const QPointF&, const QTextItem&) override { mRecorder.mComplete = false; }
+    void drawPixmap(const QRectF&, const QPixmap&, const QRectF&) override { m_recorder.m_complete = false; }
+    void drawPolygon(const QPointF*, int, PolygonDrawMode) override { m_recorder.m_complete = false; }
+    void drawTextItem(const QPointF&, const QTextItem&) override { m_recorder.m_complete = false; }
 
 private:
-    PathRecorder& mRecorder;
-    QTransform mTransform;
-    QBrush mBrush;
-    QPen mPen;
+    PathRecorder& m_recorder;
+    QTransform m_transform;
+    QBrush m_brush;
+    QPen m_pen;
 };
 
-PathRecorder::PathRecorder(QSize size) : mSize(size), mEngine(std::make_unique<Engine>(*this))
+PathRecorder::PathRecorder(QSize size) : m_size(size), m_engine(std::make_unique<Engine>(*this))
 {
 }
 
@@ -51,7 +51,7 @@ PathRecorder::~PathRecorder() = default;
 
 QPaintEngine* PathRecorder::paintEngine() const
 {
-    return mEngine.get();
+    return m_engine.get();
 }
 
 int PathRecorder::metric(PaintDeviceMetric metric) const
@@ -60,13 +60,13 @@ int PathRecorder::metric(PaintDeviceMetric metric) const
     constexpr double MILLIMETRES_PER_INCH = 25.4;
     switch (metric) {
     case PdmWidth:
-        return mSize.width();
+        return m_size.width();
     case PdmHeight:
-        return mSize.height();
+        return m_size.height();
     case PdmWidthMM:
-        return qRound(mSize.width() * MILLIMETRES_PER_INCH / DOTS_PER_INCH);
+        return qRound(m_size.width() * MILLIMETRES_PER_INCH / DOTS_PER_INCH);
     case PdmHeightMM:
-        return qRound(mSize.height() * MILLIMETRES_PER_INCH / DOTS_PER_INCH);
+        return qRound(m_size.height() * MILLIMETRES_PER_INCH / DOTS_PER_INCH);
     case PdmDpiX:
     case PdmDpiY:
     case PdmPhysicalDpiX:

@@ -23,9 +23,9 @@ public:
     explicit PathRecorder(QSize size);
     ~PathRecorder() override;
 
-    const std::vector<FilledPath>& paths() const { return mPaths; }
+    const std::vector<FilledPath>& paths() const { return m_paths; }
     // Returns whether everything painted could be recorded.
-    bool isComplete() const { return mComplete; }
+    bool isComplete() const { return m_complete; }
 
     QPaintEngine* paintEngine() const override;
 
@@ -35,8 +35,8 @@ protected:
 private:
     class Engine;
 
-    QSize mSize;
-    std::vector<FilledPath> mPaths;
-    bool mComplete = true;
-    std::unique_ptr<Engine> mEngine;
+    QSize m_size;
+    std::vector<FilledPath> m_paths;
+    bool m_complete = true;
+    std::unique_ptr<Engine> m_engine;
 };

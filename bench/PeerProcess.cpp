@@ -10,16 +10,16 @@ constexpr int START_TIME = 10000; // milliseconds
 
 PeerProcess::PeerProcess()
 {
-    mProcess.setChildProcessModifier([] { prctl(PR_SET_PDEATHSIG, SIGKILL); });
-    mProcess.setProcessChannelMode(QProcess::ForwardedErrorChannel);
+    m_process.setChildProcessModifier([] { prctl(PR_SET_PDEATHSIG, SIGKILL); });
+    m_process.setProcessChannelMode(QProcess::ForwardedErrorChannel);
 }
 
 PeerProcess::~PeerProcess()
 {
-    if (mProcess.state() == QProcess::NotRunning)
+    if (m_process.state() == QProcess::NotRunning)
         return;
-    mProcess.kill();
-    mProcess.waitForFinished();
+    m_process.kill();
+    m_process.waitForFinished();
 }
 
 bool PeerProcess::startRole(const QString& role)
@@ -29,25 +29,25 @@ bool PeerProcess::startRole(const QString& role)
 
 bool PeerProcess::startAndAwait(const QString& program, const QStringList& arguments, const QByteArray& line)
 {
-    mProcess.start(program, arguments);
+    m_process.start(program, arguments);
     QByteArray read;
     while (!read.endsWith('\n')) {
-        if (!mProcess.waitForReadyRead(START_TIME))
+        if (!m_process.waitForReadyRead(START_TIME))
             return false;
-        read += mProcess.readAllStandardOutput();
+        read += m_process.readAllStandardOutput();
     }
     return read == line;
 }
 
 bool PeerProcess::start(const QString& program, const QStringList& arguments)
 {
-    mProcess.setStandardOutputFile(QProcess::nullDevice());
-    mProcess.start(program, arguments);
-    return mProcess.waitForStarted(START_TIME);
+    m_process.setStandardOutputFile(QProcess::nullDevice());
+    m_process.start(program, arguments);
+    return m_process.waitForStarted(START_TIME);
 }
 
 bool PeerProcess::finished(int milliseconds)
 {
-    return mProcess.waitForFinished(milliseconds) && mProcess.exitStatus() == QProcess::NormalExit &&
-           mProcess.exitCode() == 0;
+    return m_process.waitForFinished(milliseconds) && m_process.exitStatus() == QProcess::NormalExit &&
+           m_process.exitCode() == 0;
 }

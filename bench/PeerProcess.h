@@ -23,9 +23,9 @@ public:
     // Waits for the end of the process. Returns whether it ended by itself with exit code 0.
     bool finished(int milliseconds);
 
-    qint64 id() const { return mProcess.processId(); }
-    QProcess& process() { return mProcess; }
+    qint64 id() const { return m_process.processId(); }
+    QProcess& process() { return m_process; }
 
 private:
-    QProcess mProcess;
+    QProcess m_process;
 };

@@ -11,7 +11,7 @@ const QSize LIST_SIZE(549, 997);
 
 } // namespace
 
-ShownList::ShownList() : list(&mLabel, false)
+ShownList::ShownList() : list(&m_label, false)
 {
     list.setFixedSize(LIST_SIZE);
     list.show();

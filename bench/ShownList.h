@@ -20,7 +20,7 @@ public:
     static void show(QWidget& window);
 
 private:
-    QLabel mLabel;
+    QLabel m_label;
 
 public:
     ArchiveList list;

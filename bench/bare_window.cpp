@@ -15,7 +15,7 @@ constexpr int HEIGHT = 1080;
 class BareWindow : public QWidget
 {
 public:
-    explicit BareWindow(bool stay) : mStay(stay)
+    explicit BareWindow(bool stay) : m_stay(stay)
     {
         setWindowTitle(QStringLiteral("bare_window"));
         resize(WIDTH, HEIGHT);
@@ -24,7 +24,7 @@ public:
 protected:
     void paintEvent(QPaintEvent*) override
     {
-        if (!mStay)
+        if (!m_stay)
             QMetaObject::invokeMethod(this, &BareWindow::finish, Qt::QueuedConnection);
     }
 
@@ -37,7 +37,7 @@ private:
         QApplication::quit();
     }
 
-    bool mStay;
+    bool m_stay;
 };
 
 } // namespace

@@ -18,13 +18,13 @@ QString toQString(const std::string& text)
 } // namespace
 
 Archive::Archive()
-    : mOrder(1, '\xff')
-    , mClip(DEFAULT_CLIP)
-    , mGain(DEFAULT_GAIN)
-    , mDensity(DEFAULT_DENSITY)
-    , mBgPointX(0.0f)
-    , mBgPointY(0.0f)
-    , mBgPointZ(-1.0f)
+    : m_order(1, '\xff')
+    , m_clip(DEFAULT_CLIP)
+    , m_gain(DEFAULT_GAIN)
+    , m_density(DEFAULT_DENSITY)
+    , m_bgPointX(0.0f)
+    , m_bgPointY(0.0f)
+    , m_bgPointZ(-1.0f)
 {
 }
 
@@ -37,25 +37,25 @@ Archive& Archive::operator=(const Archive& other)
 {
     if (this == &other)
         return *this;
-    mName = other.mName;
-    mPath = other.mPath;
-    mOrder = other.mOrder;
-    mVersion = other.mVersion;
-    mCategory = other.mCategory;
-    mThumbnailSmall = other.mThumbnailSmall;
-    mThumbnailBlack = other.mThumbnailBlack;
-    mThumbnailBig = other.mThumbnailBig;
-    mThumbnailMiddle = other.mThumbnailMiddle;
-    mBgResource = other.mBgResource;
-    mBgResourceBig = other.mBgResourceBig;
-    mBgPointX = other.mBgPointX;
-    mBgPointY = other.mBgPointY;
-    mBgPointZ = other.mBgPointZ;
-    mClip = other.mClip;
-    mGain = other.mGain;
-    mDensity = other.mDensity;
+    m_name = other.m_name;
+    m_path = other.m_path;
+    m_order = other.m_order;
+    m_version = other.m_version;
+    m_category = other.m_category;
+    m_thumbnailSmall = other.m_thumbnailSmall;
+    m_thumbnailBlack = other.m_thumbnailBlack;
+    m_thumbnailBig = other.m_thumbnailBig;
+    m_thumbnailMiddle = other.m_thumbnailMiddle;
+    m_bgResource = other.m_bgResource;
+    m_bgResourceBig = other.m_bgResourceBig;
+    m_bgPointX = other.m_bgPointX;
+    m_bgPointY = other.m_bgPointY;
+    m_bgPointZ = other.m_bgPointZ;
+    m_clip = other.m_clip;
+    m_gain = other.m_gain;
+    m_density = other.m_density;
     releaseVectorText();
-    cloneText(other.mText);
+    cloneText(other.m_text);
     return *this;
 }
 
@@ -66,24 +66,24 @@ Archive::~Archive()
 
 void Archive::cloneText(const std::vector<TText*>& text)
 {
-    mText.reserve(text.size());
+    m_text.reserve(text.size());
     for (const TText* object : text)
         if (object)
-            mText.push_back(new TText(*object));
+            m_text.push_back(new TText(*object));
 }
 
 void Archive::releaseVectorText()
 {
-    for (TText*& object : mText) {
+    for (TText*& object : m_text) {
         delete object;
         object = nullptr;
     }
-    mText.clear();
+    m_text.clear();
 }
 
 bool Archive::isPreset() const
 {
-    return !mBgResource.empty() && mBgResource.front() == '/';
+    return !m_bgResource.empty() && m_bgResource.front() == '/';
 }
 
 QString Archive::besideTitle(const std::string& name) const
@@ -93,7 +93,7 @@ QString Archive::besideTitle(const std::string& name) const
 
 std::string Archive::folder() const
 {
-    return QFile::encodeName(QFileInfo(toQString(mPath)).path()).toStdString();
+    return QFile::encodeName(QFileInfo(toQString(m_path)).path()).toStdString();
 }
 
 QString Archive::confined(const std::string& path) const
@@ -104,21 +104,21 @@ QString Archive::confined(const std::string& path) const
 
 QString Archive::getFullPathOfThumbnailSmall() const
 {
-    if (mThumbnailSmall.empty())
+    if (m_thumbnailSmall.empty())
         return QString();
-    return mThumbnailSmall.front() == '/' ? confined(mThumbnailSmall) : besideTitle(mThumbnailSmall);
+    return m_thumbnailSmall.front() == '/' ? confined(m_thumbnailSmall) : besideTitle(m_thumbnailSmall);
 }
 
 QString Archive::getFullPathOfBgResource() const
 {
-    if (mBgResource.empty())
+    if (m_bgResource.empty())
         return QString();
-    return isPreset() ? confined(mBgResource) : besideTitle(mBgResource);
+    return isPreset() ? confined(m_bgResource) : besideTitle(m_bgResource);
 }
 
 QString Archive::getFullPathOfBgResourceBig() const
 {
-    if (mBgResourceBig.empty())
+    if (m_bgResourceBig.empty())
         return QString();
-    return isPreset() ? confined(mBgResourceBig) : besideTitle(mBgResourceBig);
+    return isPreset() ? confined(m_bgResourceBig) : besideTitle(m_bgResourceBig);
 }

@@ -122,7 +122,7 @@ bool insertUnknownRows(const std::string& folder, const std::vector<ArchiveOrder
 
 } // namespace
 
-ArchiveController::ArchiveController() : mArchiveManager(ArchiveManager::getInstance())
+ArchiveController::ArchiveController() : m_archiveManager(ArchiveManager::getInstance())
 {
 }
 
@@ -130,7 +130,7 @@ ArchiveController::~ArchiveController() = default;
 
 QList<std::string> ArchiveController::getFolderList()
 {
-    const std::vector<std::string> folders = mArchiveManager->getArchiveFolderList();
+    const std::vector<std::string> folders = m_archiveManager->getArchiveFolderList();
     return QList<std::string>(folders.begin(), folders.end());
 }
 
@@ -148,14 +148,14 @@ QList<Archive*> ArchiveController::getArchiveList(QString folder)
 
 bool ArchiveController::getOneArchive(QString path, Archive* archive)
 {
-    return mArchiveManager->loadArchive(path.toStdString(), archive) != 0;
+    return m_archiveManager->loadArchive(path.toStdString(), archive) != 0;
 }
 
 bool ArchiveController::saveNewArchive(QString path, Archive* archive)
 {
     if (path.isEmpty() || !archive)
         return false;
-    const int result = mArchiveManager->saveArchive(archive->getPath(), archive);
+    const int result = m_archiveManager->saveArchive(archive->getPath(), archive);
     if (result == 1)
         logDebug(L"Save new Archive Success !");
     else if (result == 0)
@@ -167,7 +167,7 @@ bool ArchiveController::saveNewArchive(QString path, Archive* archive)
 
 bool ArchiveController::deleteArchive(QString path)
 {
-    return !path.isEmpty() && mArchiveManager->deleteArchive(path.toStdString()) == 1;
+    return !path.isEmpty() && m_archiveManager->deleteArchive(path.toStdString()) == 1;
 }
 
 bool ArchiveController::saveArchiveListOrder(QString folder, QList<ArchiveOrder*> rows)
@@ -179,7 +179,7 @@ bool ArchiveController::saveArchiveListOrder(QString folder, QList<ArchiveOrder*
     for (const ArchiveOrder* row : rows)
         if (row)
             copies.push_back(*row);
-    return mArchiveManager->setArchivesSortUnderFolder(folder.toStdString(), std::move(copies)) == 1;
+    return m_archiveManager->setArchivesSortUnderFolder(folder.toStdString(), std::move(copies)) == 1;
 }
 
 bool ArchiveController::prepareOrder(QString folder)
@@ -191,7 +191,7 @@ bool ArchiveController::prepareOrder(QString folder)
     if (state == FolderOrder::State::Unreadable)
         return false; // it may be intact, so do not overwrite it
     const std::vector<ArchiveOrder> rows =
-        FolderOrder::rowsByName(mArchiveManager->getFileListUnderFolder(path));
+        FolderOrder::rowsByName(m_archiveManager->getFileListUnderFolder(path));
     if (rows.empty())
         return state == FolderOrder::State::Missing;
     FolderOrder::writeOrKeep(path, rows);
@@ -215,30 +215,30 @@ bool ArchiveController::saveListedOrder(QString folder, QList<ArchiveOrder*> lis
 
 std::vector<ArchiveOrder*> ArchiveController::getFileOrder(QString folder)
 {
-    mFileOrder = mArchiveManager->getArchivesSortUnderFolder(folder.toStdString());
-    for (ArchiveOrder* row : mFileOrder)
-        mFetchedRows.emplace_back(row);
-    return mFileOrder;
+    m_fileOrder = m_archiveManager->getArchivesSortUnderFolder(folder.toStdString());
+    for (ArchiveOrder* row : m_fileOrder)
+        m_fetchedRows.emplace_back(row);
+    return m_fileOrder;
 }
 
 QString ArchiveController::getLastArchivePath()
 {
-    return toQString(mArchiveManager->loadLastArchive());
+    return toQString(m_archiveManager->loadLastArchive());
 }
 
 int ArchiveController::setLastArchivePath(QString path)
 {
-    return mArchiveManager->saveLastArchive(path.toStdString());
+    return m_archiveManager->saveLastArchive(path.toStdString());
 }
 
 QString ArchiveController::getLastFolderPath()
 {
-    return toQString(mArchiveManager->loadLastFolder());
+    return toQString(m_archiveManager->loadLastFolder());
 }
 
 int ArchiveController::setLastFolderPath(QString path)
 {
-    return mArchiveManager->saveLastFolder(path.toStdString());
+    return m_archiveManager->saveLastFolder(path.toStdString());
 }
 
 int ArchiveController::copyArchiveBg(Archive* from, Archive* to)
@@ -289,7 +289,7 @@ QString ArchiveController::getFreeNameInUserTemplate(QString folder)
 bool ArchiveController::createNewOrderAccordingToFilesUnderFolder(QString folder)
 {
     const std::string path = folder.toStdString();
-    const std::vector<std::string> files = mArchiveManager->getFileListUnderFolder(path);
+    const std::vector<std::string> files = m_archiveManager->getFileListUnderFolder(path);
     if (files.empty())
         return false;
     std::vector<ArchiveOrder> rows;
@@ -311,7 +311,7 @@ QList<std::string> ArchiveController::reCreateOrderXml()
 void ArchiveController::deleteUnusefulArchives(QString folder)
 {
     const std::string path = folder.toStdString();
-    std::vector<std::string> victims = mArchiveManager->getFileListUnderFolder(path);
+    std::vector<std::string> victims = m_archiveManager->getFileListUnderFolder(path);
     if (victims.empty())
         return;
     std::vector<ArchiveOrder> rows;
@@ -326,7 +326,7 @@ void ArchiveController::deleteUnusefulArchives(QString folder)
         victims = getDeletedFileList(std::move(victims), std::move(targets));
     }
     for (const std::string& victim : victims) {
-        if (mArchiveManager->deleteArchive(victim) != 1) {
+        if (m_archiveManager->deleteArchive(victim) != 1) {
             logDebug(L"Delete XML false");
             continue;
         }

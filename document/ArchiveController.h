@@ -85,7 +85,7 @@ public:
                                                 std::vector<std::string> targets);
 
 private:
-    ArchiveManager* mArchiveManager;       // shared, not owned
-    std::vector<ArchiveOrder*> mFileOrder; // the result of the last getFileOrder()
-    std::vector<std::unique_ptr<ArchiveOrder>> mFetchedRows;
+    ArchiveManager* m_archiveManager;       // shared, not owned
+    std::vector<ArchiveOrder*> m_fileOrder; // the result of the last getFileOrder()
+    std::vector<std::unique_ptr<ArchiveOrder>> m_fetchedRows;
 };

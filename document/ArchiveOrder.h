@@ -6,14 +6,14 @@
 class ArchiveOrder
 {
 public:
-    int getArchiveIndex() const { return mArchiveIndex; }
-    void setArchiveIndex(int index) { mArchiveIndex = index; }
+    int getArchiveIndex() const { return m_archiveIndex; }
+    void setArchiveIndex(int index) { m_archiveIndex = index; }
 
     // The file name of the title, relative to the folder.
-    const std::string& getArchivePath() const { return mArchivePath; }
-    void setArchivePath(const std::string& path) { mArchivePath = path; }
+    const std::string& getArchivePath() const { return m_archivePath; }
+    void setArchivePath(const std::string& path) { m_archivePath = path; }
 
 private:
-    int mArchiveIndex = -1;
-    std::string mArchivePath;
+    int m_archiveIndex = -1;
+    std::string m_archivePath;
 };

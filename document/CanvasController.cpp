@@ -8,7 +8,7 @@
 
 #include <cerrno>
 
-CanvasController::CanvasController() : mArchiveManager(ArchiveManager::getInstance())
+CanvasController::CanvasController() : m_archiveManager(ArchiveManager::getInstance())
 {
 }
 
@@ -16,7 +16,7 @@ bool CanvasController::saveArchiveChange(QString path, Archive* archive)
 {
     if (path.isEmpty())
         return false;
-    const int result = mArchiveManager->saveArchive(path.toStdString(), archive);
+    const int result = m_archiveManager->saveArchive(path.toStdString(), archive);
     const int error = errno;
     const wchar_t* const text = result == 1   ? L"Save Archive Success !"
                                 : result == 0 ? L"Path is invalid !"
@@ -29,5 +29,5 @@ bool CanvasController::saveArchiveChange(QString path, Archive* archive)
 
 int CanvasController::getTextStyle(FontStyle* style)
 {
-    return mSettingManager.loadLastTextParameter(style);
+    return m_settingManager.loadLastTextParameter(style);
 }

@@ -23,6 +23,6 @@ public:
     int getTextStyle(FontStyle* style);
 
 private:
-    ArchiveManager* mArchiveManager; // shared, not owned
-    SettingManager mSettingManager;
+    ArchiveManager* m_archiveManager; // shared, not owned
+    SettingManager m_settingManager;
 };

@@ -39,28 +39,28 @@ void onAllCores(std::size_t count, const Job& job)
 
 } // namespace
 
-FolderTitles::FolderTitles(std::string folder, WithoutOrder withoutOrder) : mFolder(std::move(folder))
+FolderTitles::FolderTitles(std::string folder, WithoutOrder withoutOrder) : m_folder(std::move(folder))
 {
-    if (mFolder.empty())
+    if (m_folder.empty())
         return;
     std::vector<ArchiveOrder> rows;
     if (withoutOrder == WithoutOrder::ByName)
-        rows = FolderOrder::rowsToShow(mFolder);
+        rows = FolderOrder::rowsToShow(m_folder);
     else
-        FolderOrder::read(mFolder, rows);
-    mNames.reserve(rows.size());
+        FolderOrder::read(m_folder, rows);
+    m_names.reserve(rows.size());
     for (const ArchiveOrder& row : rows)
-        mNames.push_back(row.getArchivePath());
+        m_names.push_back(row.getArchivePath());
 }
 
 std::string FolderTitles::path(std::size_t row) const
 {
-    return mNames[row].empty() ? std::string() : mFolder + STR_SLASH + mNames[row];
+    return m_names[row].empty() ? std::string() : m_folder + STR_SLASH + m_names[row];
 }
 
 bool FolderTitles::canBeTitle(std::size_t row) const
 {
-    return mNames[row].empty() || mNames[row].size() >= EXTENSION_LENGTH;
+    return m_names[row].empty() || m_names[row].size() >= EXTENSION_LENGTH;
 }
 
 std::unique_ptr<Archive> FolderTitles::read(std::size_t row) const
@@ -68,12 +68,12 @@ std::unique_ptr<Archive> FolderTitles::read(std::size_t row) const
     if (!canBeTitle(row))
         return nullptr;
     auto archive = std::make_unique<Archive>();
-    const std::string& name = mNames[row];
+    const std::string& name = m_names[row];
     if (name.empty())
         return archive;
     archive->setName(name.substr(0, name.size() - EXTENSION_LENGTH));
     archive->setOrder(std::to_string(row + 1));
-    const std::string title = ConfinedPath::namedByOrder(mFolder, name);
+    const std::string title = ConfinedPath::namedByOrder(m_folder, name);
     if (title.empty() || TitleParser().readOneTitle(title, archive.get()) < 1)
         return nullptr;
     return archive;

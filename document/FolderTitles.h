@@ -18,9 +18,9 @@ public:
     // An empty path gives no rows.
     explicit FolderTitles(std::string folder, WithoutOrder withoutOrder = WithoutOrder::Nothing);
 
-    std::size_t count() const { return mNames.size(); }
+    std::size_t count() const { return m_names.size(); }
     // Returns the name of the title file relative to the folder; empty for a row without a name.
-    const std::string& fileName(std::size_t row) const { return mNames[row]; }
+    const std::string& fileName(std::size_t row) const { return m_names[row]; }
     // Returns the full path of the title file; empty for a row without a name.
     std::string path(std::size_t row) const;
     // Returns false if the name is too short for a title file.
@@ -34,6 +34,6 @@ public:
     std::vector<std::unique_ptr<Archive>> read(std::size_t first, std::size_t count) const;
 
 private:
-    std::string mFolder;
-    std::vector<std::string> mNames;
+    std::string m_folder;
+    std::vector<std::string> m_names;
 };

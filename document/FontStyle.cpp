@@ -3,14 +3,14 @@
 #include "document/DocumentConstants.h"
 
 FontStyle::FontStyle()
-    : mSize(96)
-    , mBold(0)
-    , mItalic(0)
-    , mShadowStyle(0)
-    , mEdge(0)
-    , mKerning(100)
-    , mAlign(-1)
-    , mFamily(DEFAULT_FONT_FAMILY)
-    , mColor(DEFAULT_FONT_CORLOR)
+    : m_size(96)
+    , m_bold(0)
+    , m_italic(0)
+    , m_shadowStyle(0)
+    , m_edge(0)
+    , m_kerning(100)
+    , m_align(-1)
+    , m_family(DEFAULT_FONT_FAMILY)
+    , m_color(DEFAULT_FONT_CORLOR)
 {
 }

@@ -13,45 +13,45 @@ class FontStyle
 public:
     FontStyle();
 
-    int getSize() const { return mSize; }
-    void setSize(int size) { mSize = size; }
-    int getBold() const { return mBold; }
-    void setBold(int bold) { mBold = bold; }
-    int getItalic() const { return mItalic; }
-    void setItalic(int italic) { mItalic = italic; }
-    int getShadowStyle() const { return mShadowStyle; }
-    void setShadowStyle(int style) { mShadowStyle = style; }
-    int getEdge() const { return mEdge; }
-    void setEdge(int edge) { mEdge = edge; }
-    int getKerning() const { return mKerning; }
-    void setKerning(int kerning) { mKerning = kerning; }
-    int getAlign() const { return mAlign; }
-    void setAlign(int align) { mAlign = align; }
-    const std::string& getFamily() const { return mFamily; }
-    void setFamily(const std::string& family) { mFamily = family; }
-    const std::string& getColor() const { return mColor; }
-    void setColor(const std::string& color) { mColor = color; }
+    int getSize() const { return m_size; }
+    void setSize(int size) { m_size = size; }
+    int getBold() const { return m_bold; }
+    void setBold(int bold) { m_bold = bold; }
+    int getItalic() const { return m_italic; }
+    void setItalic(int italic) { m_italic = italic; }
+    int getShadowStyle() const { return m_shadowStyle; }
+    void setShadowStyle(int style) { m_shadowStyle = style; }
+    int getEdge() const { return m_edge; }
+    void setEdge(int edge) { m_edge = edge; }
+    int getKerning() const { return m_kerning; }
+    void setKerning(int kerning) { m_kerning = kerning; }
+    int getAlign() const { return m_align; }
+    void setAlign(int align) { m_align = align; }
+    const std::string& getFamily() const { return m_family; }
+    void setFamily(const std::string& family) { m_family = family; }
+    const std::string& getColor() const { return m_color; }
+    void setColor(const std::string& color) { m_color = color; }
 
     // Never null. Owned by this record; may be changed in place.
-    TEdge* getEdgePoint() { return &mEdgePoint; }
-    const TEdge* getEdgePoint() const { return &mEdgePoint; }
-    void setEdgePoint(TEdge edge) { mEdgePoint = std::move(edge); }
+    TEdge* getEdgePoint() { return &m_edgePoint; }
+    const TEdge* getEdgePoint() const { return &m_edgePoint; }
+    void setEdgePoint(TEdge edge) { m_edgePoint = std::move(edge); }
 
     // Never null. Owned by this record; may be changed in place.
-    TShadow* getShadowPoint() { return &mShadowPoint; }
-    const TShadow* getShadowPoint() const { return &mShadowPoint; }
-    void setShadowPoint(TShadow shadow) { mShadowPoint = std::move(shadow); }
+    TShadow* getShadowPoint() { return &m_shadowPoint; }
+    const TShadow* getShadowPoint() const { return &m_shadowPoint; }
+    void setShadowPoint(TShadow shadow) { m_shadowPoint = std::move(shadow); }
 
 private:
-    int mSize;
-    int mBold;
-    int mItalic;
-    int mShadowStyle;
-    int mEdge;
-    int mKerning;
-    int mAlign;
-    std::string mFamily;
-    std::string mColor;
-    TEdge mEdgePoint;
-    TShadow mShadowPoint;
+    int m_size;
+    int m_bold;
+    int m_italic;
+    int m_shadowStyle;
+    int m_edge;
+    int m_kerning;
+    int m_align;
+    std::string m_family;
+    std::string m_color;
+    TEdge m_edgePoint;
+    TShadow m_shadowPoint;
 };

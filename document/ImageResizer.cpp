@@ -150,7 +150,7 @@ bool ImageResizer::resizeImageToThumbnailTitlerWithAlpha(const std::wstring& pat
 bool ImageResizer::save(const QImage& image, const std::wstring& path)
 {
     const QString file = QString::fromStdWString(path);
-    return mTitle.empty() ? PngWriter::save(image, file) : PngWriter::saveOrKeep(image, file, mTitle);
+    return m_title.empty() ? PngWriter::save(image, file) : PngWriter::saveOrKeep(image, file, m_title);
 }
 
 bool ImageResizer::isAvailableImage(std::wstring path)

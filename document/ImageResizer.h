@@ -14,7 +14,7 @@ public:
 
     // After this call, pictures that cannot be written are kept for this title (PngWriter::saveOrKeep), and
     // saving does not wait for a sync.
-    void keepRefusedFor(std::string title) { mTitle = std::move(title); }
+    void keepRefusedFor(std::string title) { m_title = std::move(title); }
 
     // Reduces the picture at source to a quarter of its width and height and saves it twice: over black to
     // blackPath, and over the checker picture to smallPath (for an opaque picture both are equal). width and
@@ -53,7 +53,7 @@ private:
     bool resizeImageToThumbnailTitlerWithAlpha(const std::wstring& path, const QImage& composed);
     bool save(const QImage& image, const std::wstring& path);
 
-    std::string mTitle; // if empty, pictures that cannot be written are not kept
+    std::string m_title; // if empty, pictures that cannot be written are not kept
 
     static std::string checkerFname_in_title;
     static std::string checkerFname_in_logo;

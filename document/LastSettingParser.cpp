@@ -22,7 +22,7 @@ LastSettingParser::LastSettingParser(std::string folder)
     if (folder.empty())
         folder = FolderLookup::multiByte(&IPathManagerEx::getSystemSettingPath);
     if (!folder.empty())
-        mFilePath = folder + TEMP_FILENAME;
+        m_filePath = folder + TEMP_FILENAME;
 }
 
 bool LastSettingParser::createTempFile(const std::string& element, const std::string& attribute,
@@ -43,7 +43,7 @@ bool LastSettingParser::editTempFile(const std::string& element, const std::stri
                                      const std::string& value)
 {
     TiXmlDocument document;
-    if (!XmlFile::load(mFilePath, document))
+    if (!XmlFile::load(m_filePath, document))
         return createTempFile(element, attribute, value);
     TiXmlElement* root = document.RootElement();
     if (!root)
@@ -61,17 +61,17 @@ bool LastSettingParser::editTempFile(const std::string& element, const std::stri
 // title.
 bool LastSettingParser::save(const TiXmlDocument& document)
 {
-    if (mFilePath.empty() || XmlFile::save(document, mFilePath))
-        return !mFilePath.empty();
+    if (m_filePath.empty() || XmlFile::save(document, m_filePath))
+        return !m_filePath.empty();
     LOG_DEBUG_OPERATE(L"LastSettingParser", LOG_NUMBER,
-                      QString::fromStdString("cannot write " + mFilePath).toStdWString());
+                      QString::fromStdString("cannot write " + m_filePath).toStdWString());
     return false;
 }
 
 std::string LastSettingParser::getTempAttribute(const std::string& element, const std::string& attribute)
 {
     TiXmlDocument document;
-    if (!XmlFile::load(mFilePath, document) || !document.RootElement())
+    if (!XmlFile::load(m_filePath, document) || !document.RootElement())
         return {};
     return TitleParserUtility::getAttribute(document.RootElement()->FirstChildElement(element), attribute);
 }

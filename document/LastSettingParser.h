@@ -30,5 +30,5 @@ public:
 private:
     bool save(const TiXmlDocument& document);
 
-    std::string mFilePath;
+    std::string m_filePath;
 };

@@ -19,15 +19,15 @@ constexpr quint64 DECODED_PIXEL_BYTES = 4;
 class Reader
 {
 public:
-    explicit Reader(std::string_view bytes) : mBytes(bytes) {}
+    explicit Reader(std::string_view bytes) : m_bytes(bytes) {}
 
-    quint64 size() const { return mBytes.size(); }
-    bool hasFailed() const { return mHasFailed; }
+    quint64 size() const { return m_bytes.size(); }
+    bool hasFailed() const { return m_hasFailed; }
     bool has(quint64 at, quint64 count) const { return at <= size() && count <= size() - at; }
 
     std::string_view text(quint64 at, quint64 count)
     {
-        return claim(at, count) ? mBytes.substr(at, count) : std::string_view();
+        return claim(at, count) ? m_bytes.substr(at, count) : std::string_view();
     }
     quint8 byte(quint64 at) { return number<quint8>(at, true); }
     template <typename T>
@@ -45,19 +45,19 @@ public:
     {
         if (!claim(at, sizeof(T)))
             return 0;
-        const char* const place = mBytes.data() + at;
+        const char* const place = m_bytes.data() + at;
         return isBigEndian ? qFromBigEndian<T>(place) : qFromLittleEndian<T>(place);
     }
 
 private:
     bool claim(quint64 at, quint64 count)
     {
-        mHasFailed = mHasFailed || !has(at, count);
-        return !mHasFailed;
+        m_hasFailed = m_hasFailed || !has(at, count);
+        return !m_hasFailed;
     }
 
-    std::string_view mBytes;
-    bool mHasFailed = false;
+    std::string_view m_bytes;
+    bool m_hasFailed = false;
 };
 
 // Returns the size of a picture whose decoder needs pixelBytes bytes per pixel, or nothing if it exceeds a
@@ -389,6 +389,6 @@ PictureGuard::PictureGuard(const QByteArray& bytes)
     const std::optional<QSize> size = format->size(reader);
     if (!size)
         return;
-    mFormat = format->name;
-    mSize = *size;
+    m_format = format->name;
+    m_size = *size;
 }

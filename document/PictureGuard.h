@@ -17,15 +17,15 @@ public:
     // Checks the headers of a whole file. Refuses formats other than PNG, BMP, JPEG, GIF and TIFF.
     explicit PictureGuard(const QByteArray& bytes);
 
-    bool isAccepted() const { return !mFormat.isEmpty(); }
+    bool isAccepted() const { return !m_format.isEmpty(); }
 
     // Returns Qt's name of the format; empty if refused. Only this decoder may read the bytes.
-    QByteArray format() const { return mFormat; }
+    QByteArray format() const { return m_format; }
 
     // Returns the stored size in pixels; empty if refused.
-    QSize size() const { return isAccepted() ? mSize : QSize(); }
+    QSize size() const { return isAccepted() ? m_size : QSize(); }
 
 private:
-    QByteArray mFormat;
-    QSize mSize;
+    QByteArray m_format;
+    QSize m_size;
 };

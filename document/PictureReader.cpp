@@ -24,29 +24,29 @@ void setAllocationLimit()
 
 PictureReader::PictureReader(const QString& path)
 {
-    if (path.isEmpty() || !AtomicFile::read(QFile::encodeName(path).toStdString(), MAX_FILE_BYTES, mBytes))
+    if (path.isEmpty() || !AtomicFile::read(QFile::encodeName(path).toStdString(), MAX_FILE_BYTES, m_bytes))
         return;
     const PictureGuard guard(bytes());
-    mFormat = guard.format();
-    mSize = guard.size();
+    m_format = guard.format();
+    m_size = guard.size();
     if (!guard.isAccepted())
-        mBytes = std::string();
+        m_bytes = std::string();
 }
 
 QByteArray PictureReader::bytes() const
 {
-    return QByteArray::fromRawData(mBytes.data(), static_cast<qsizetype>(mBytes.size()));
+    return QByteArray::fromRawData(m_bytes.data(), static_cast<qsizetype>(m_bytes.size()));
 }
 
 QImage PictureReader::read(const QSize& scaledSize) const
 {
-    if (mFormat.isEmpty())
+    if (m_format.isEmpty())
         return {};
     setAllocationLimit();
     QByteArray shared = bytes();
     QBuffer buffer(&shared);
     buffer.open(QIODevice::ReadOnly);
-    QImageReader reader(&buffer, mFormat);
+    QImageReader reader(&buffer, m_format);
     reader.setAutoDetectImageFormat(false);
     if (scaledSize.isValid())
         reader.setScaledSize(scaledSize);

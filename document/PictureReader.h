@@ -19,7 +19,7 @@ public:
     explicit PictureReader(const QString& path);
 
     // Returns the stored size in pixels.
-    QSize size() const { return mSize; }
+    QSize size() const { return m_size; }
 
     // Decodes the picture and scales it to scaledSize if that is valid, which for some formats is faster than
     // scaling it later. Returns null if the decoder fails.
@@ -29,9 +29,9 @@ public:
     static QImage read(const QString& path);
 
 private:
-    QByteArray bytes() const; // shares the memory of mBytes; valid during the lifetime of this object
+    QByteArray bytes() const; // shares the memory of m_bytes; valid during the lifetime of this object
 
-    std::string mBytes;
-    QByteArray mFormat;
-    QSize mSize;
+    std::string m_bytes;
+    QByteArray m_format;
+    QSize m_size;
 };

@@ -13,13 +13,13 @@ SettingManager::SettingManager()
 {
     const std::string folder = FolderLookup::multiByte(&IPathManagerEx::getSystemSettingPath);
     if (!folder.empty())
-        mFilePath = folder + SETTING_FILENAME;
+        m_filePath = folder + SETTING_FILENAME;
 }
 
 int SettingManager::loadLastTextParameter(FontStyle* style)
 {
     TiXmlDocument document;
-    if (!style || mFilePath.empty() || !XmlFile::load(mFilePath, document) || !document.RootElement())
+    if (!style || m_filePath.empty() || !XmlFile::load(m_filePath, document) || !document.RootElement())
         return 0;
     TiXmlElement* element = document.RootElement()->FirstChildElement(SETTING_FONT_STYLE);
     return element ? getFontStyle(element, style) : 0;
@@ -27,7 +27,7 @@ int SettingManager::loadLastTextParameter(FontStyle* style)
 
 int SettingManager::saveLastTextParameter(FontStyle* style)
 {
-    if (!style || mFilePath.empty())
+    if (!style || m_filePath.empty())
         return 0;
     TiXmlDocument document;
     document.LinkEndChild(new TiXmlDeclaration(XML_VERSION, XML_ENCODING, STR_EMPTY));
@@ -37,7 +37,7 @@ int SettingManager::saveLastTextParameter(FontStyle* style)
     auto* element = new TiXmlElement(SETTING_FONT_STYLE);
     setFontStyle(element, style);
     root->LinkEndChild(element);
-    return XmlFile::save(document, mFilePath) ? 1 : 0;
+    return XmlFile::save(document, m_filePath) ? 1 : 0;
 }
 
 int SettingManager::resetTextParameter()

@@ -54,5 +54,5 @@ public:
     int getIntAttribute(TiXmlElement* element, std::string key);
 
 private:
-    std::string mFilePath;
+    std::string m_filePath;
 };

@@ -2,11 +2,11 @@
 
 #include "document/DocumentConstants.h"
 
-TEdge::TEdge() : mEdgeColor(DEFAULT_EDGE_COLOR), mEdgeWidth(2)
+TEdge::TEdge() : m_edgeColor(DEFAULT_EDGE_COLOR), m_edgeWidth(2)
 {
 }
 
 bool TEdge::operator==(const TEdge& other) const
 {
-    return this == &other || (mEdgeWidth == other.mEdgeWidth && mEdgeColor == other.mEdgeColor);
+    return this == &other || (m_edgeWidth == other.m_edgeWidth && m_edgeColor == other.m_edgeColor);
 }

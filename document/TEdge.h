@@ -8,14 +8,14 @@ class TEdge
 public:
     TEdge();
 
-    const std::string& getEdgeColor() const { return mEdgeColor; }
-    void setEdgeColor(const std::string& color) { mEdgeColor = color; }
-    int getEdgeWidth() const { return mEdgeWidth; }
-    void setEdgeWidth(int width) { mEdgeWidth = width; }
+    const std::string& getEdgeColor() const { return m_edgeColor; }
+    void setEdgeColor(const std::string& color) { m_edgeColor = color; }
+    int getEdgeWidth() const { return m_edgeWidth; }
+    void setEdgeWidth(int width) { m_edgeWidth = width; }
 
     bool operator==(const TEdge& other) const;
 
 private:
-    std::string mEdgeColor;
-    int mEdgeWidth;
+    std::string m_edgeColor;
+    int m_edgeWidth;
 };

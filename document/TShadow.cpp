@@ -3,13 +3,17 @@
 #include "document/DocumentConstants.h"
 
 TShadow::TShadow()
-    : mShadowColor(DEFAULT_SHADOW_COLOR), mShadowDirectionX(0), mShadowDirectionY(0), mShadowBlurRadius(18.3)
+    : m_shadowColor(DEFAULT_SHADOW_COLOR)
+    , m_shadowDirectionX(0)
+    , m_shadowDirectionY(0)
+    , m_shadowBlurRadius(18.3)
 {
 }
 
 bool TShadow::operator==(const TShadow& other) const
 {
     return this == &other ||
-           (mShadowDirectionX == other.mShadowDirectionX && mShadowDirectionY == other.mShadowDirectionY &&
-            mShadowBlurRadius == other.mShadowBlurRadius && mShadowColor == other.mShadowColor);
+           (m_shadowDirectionX == other.m_shadowDirectionX &&
+            m_shadowDirectionY == other.m_shadowDirectionY &&
+            m_shadowBlurRadius == other.m_shadowBlurRadius && m_shadowColor == other.m_shadowColor);
 }

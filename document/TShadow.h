@@ -8,21 +8,21 @@ class TShadow
 public:
     TShadow();
 
-    const std::string& getShadowColor() const { return mShadowColor; }
-    void setShadowColor(const std::string& color) { mShadowColor = color; }
-    int getShadowDirectionX() const { return mShadowDirectionX; }
-    void setShadowDirectionX(int x) { mShadowDirectionX = x; }
-    int getShadowDirectionY() const { return mShadowDirectionY; }
-    void setShadowDirectionY(int y) { mShadowDirectionY = y; }
-    double getShadowBlurRadius() const { return mShadowBlurRadius; }
-    void setShadowBlurRadius(double radius) { mShadowBlurRadius = radius; }
+    const std::string& getShadowColor() const { return m_shadowColor; }
+    void setShadowColor(const std::string& color) { m_shadowColor = color; }
+    int getShadowDirectionX() const { return m_shadowDirectionX; }
+    void setShadowDirectionX(int x) { m_shadowDirectionX = x; }
+    int getShadowDirectionY() const { return m_shadowDirectionY; }
+    void setShadowDirectionY(int y) { m_shadowDirectionY = y; }
+    double getShadowBlurRadius() const { return m_shadowBlurRadius; }
+    void setShadowBlurRadius(double radius) { m_shadowBlurRadius = radius; }
 
     // Compares exactly, including the blur radius. A NaN is equal only within the same object.
     bool operator==(const TShadow& other) const;
 
 private:
-    std::string mShadowColor;
-    int mShadowDirectionX;
-    int mShadowDirectionY;
-    double mShadowBlurRadius;
+    std::string m_shadowColor;
+    int m_shadowDirectionX;
+    int m_shadowDirectionY;
+    double m_shadowBlurRadius;
 };

@@ -5,37 +5,43 @@
 #include <algorithm>
 
 TText::TText()
-    : mTextObjectID(0), mText(DEFAULT_TEXT), mX(-1.0f), mY(-1.0f), mZ(-1.0f), mTextAlign(-1), mShadowStyle(0)
+    : m_textObjectID(0)
+    , m_text(DEFAULT_TEXT)
+    , m_x(-1.0f)
+    , m_y(-1.0f)
+    , m_z(-1.0f)
+    , m_textAlign(-1)
+    , m_shadowStyle(0)
 {
 }
 
 TText::TText(const TText& other)
-    : mTextObjectID(other.mTextObjectID)
-    , mText(other.mText)
-    , mX(other.mX)
-    , mY(other.mY)
-    , mZ(other.mZ)
-    , mTextAlign(other.mTextAlign)
-    , mShadowStyle(other.mShadowStyle)
-    , mTextShadow(other.mTextShadow)
+    : m_textObjectID(other.m_textObjectID)
+    , m_text(other.m_text)
+    , m_x(other.m_x)
+    , m_y(other.m_y)
+    , m_z(other.m_z)
+    , m_textAlign(other.m_textAlign)
+    , m_shadowStyle(other.m_shadowStyle)
+    , m_textShadow(other.m_textShadow)
 {
-    cloneTextItems(other.mTextItems);
+    cloneTextItems(other.m_textItems);
 }
 
 TText& TText::operator=(const TText& other)
 {
     if (this == &other)
         return *this;
-    mTextObjectID = other.mTextObjectID;
-    mText = other.mText;
-    mX = other.mX;
-    mY = other.mY;
-    mZ = other.mZ;
-    mTextAlign = other.mTextAlign;
-    mShadowStyle = other.mShadowStyle;
-    mTextShadow = other.mTextShadow;
+    m_textObjectID = other.m_textObjectID;
+    m_text = other.m_text;
+    m_x = other.m_x;
+    m_y = other.m_y;
+    m_z = other.m_z;
+    m_textAlign = other.m_textAlign;
+    m_shadowStyle = other.m_shadowStyle;
+    m_textShadow = other.m_textShadow;
     releaseVectorTextStyle();
-    cloneTextItems(other.mTextItems);
+    cloneTextItems(other.m_textItems);
     return *this;
 }
 
@@ -46,36 +52,37 @@ TText::~TText()
 
 void TText::cloneTextItems(const std::vector<TextStyle*>& items)
 {
-    mTextItems.reserve(items.size());
+    m_textItems.reserve(items.size());
     for (const TextStyle* item : items)
         if (item)
-            mTextItems.push_back(new TextStyle(*item));
+            m_textItems.push_back(new TextStyle(*item));
 }
 
 void TText::releaseVectorTextStyle()
 {
-    for (TextStyle*& item : mTextItems) {
+    for (TextStyle*& item : m_textItems) {
         delete item;
         item = nullptr;
     }
-    mTextItems.clear();
+    m_textItems.clear();
 }
 
 bool TText::XYZvalueIsTheSame(const TText& other) const
 {
-    return mX == other.mX && mY == other.mY && mZ == other.mZ;
+    return m_x == other.m_x && m_y == other.m_y && m_z == other.m_z;
 }
 
 bool TText::shadowIsTheSame(const TText& other) const
 {
-    if (mShadowStyle != other.mShadowStyle)
+    if (m_shadowStyle != other.m_shadowStyle)
         return false;
-    return mShadowStyle < 1 || mTextShadow == other.mTextShadow;
+    return m_shadowStyle < 1 || m_textShadow == other.m_textShadow;
 }
 
 bool TText::textItemsIsTheSame(const TText& other) const
 {
-    return std::equal(mTextItems.begin(), mTextItems.end(), other.mTextItems.begin(), other.mTextItems.end(),
+    return std::equal(m_textItems.begin(), m_textItems.end(), other.m_textItems.begin(),
+                      other.m_textItems.end(),
                       [](const TextStyle* a, const TextStyle* b) { return a == b || (a && b && *a == *b); });
 }
 
@@ -83,6 +90,6 @@ bool TText::operator==(const TText& other) const
 {
     if (this == &other)
         return true;
-    return XYZvalueIsTheSame(other) && mTextObjectID == other.mTextObjectID && mText == other.mText &&
-           mTextAlign == other.mTextAlign && shadowIsTheSame(other) && textItemsIsTheSame(other);
+    return XYZvalueIsTheSame(other) && m_textObjectID == other.m_textObjectID && m_text == other.m_text &&
+           m_textAlign == other.m_textAlign && shadowIsTheSame(other) && textItemsIsTheSame(other);
 }

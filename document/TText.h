@@ -18,41 +18,41 @@ public:
     TText& operator=(const TText& other);
     ~TText();
 
-    int getTextObjectID() const { return mTextObjectID; }
-    void setTextObjectID(int id) { mTextObjectID = id; }
-    const std::string& getText() const { return mText; }
-    void setText(std::string text) { mText = std::move(text); }
+    int getTextObjectID() const { return m_textObjectID; }
+    void setTextObjectID(int id) { m_textObjectID = id; }
+    const std::string& getText() const { return m_text; }
+    void setText(std::string text) { m_text = std::move(text); }
 
-    float getXValue() const { return mX; }
-    void setXValue(float x) { mX = x; }
-    float getYValue() const { return mY; }
-    void setYValue(float y) { mY = y; }
-    float getZValue() const { return mZ; }
-    void setZValue(float z) { mZ = z; }
+    float getXValue() const { return m_x; }
+    void setXValue(float x) { m_x = x; }
+    float getYValue() const { return m_y; }
+    void setYValue(float y) { m_y = y; }
+    float getZValue() const { return m_z; }
+    void setZValue(float z) { m_z = z; }
 
     // -1 left, 0 centre, 1 right.
-    int getTextAlign() const { return mTextAlign; }
-    void setTextAlign(int align) { mTextAlign = align; }
+    int getTextAlign() const { return m_textAlign; }
+    void setTextAlign(int align) { m_textAlign = align; }
 
     // 0 for no shadow, 1 to 3 for the presets.
-    int getShadowStyle() const { return mShadowStyle; }
-    void setShadowStyle(int style) { mShadowStyle = style; }
+    int getShadowStyle() const { return m_shadowStyle; }
+    void setShadowStyle(int style) { m_shadowStyle = style; }
 
     // Never null. Owned by this record; may be changed in place. Keeps its values while the style is 0.
-    TShadow* getTextShadow() { return &mTextShadow; }
-    const TShadow* getTextShadow() const { return &mTextShadow; }
-    void setTextShadow(const TShadow& shadow) { mTextShadow = shadow; }
+    TShadow* getTextShadow() { return &m_textShadow; }
+    const TShadow* getTextShadow() const { return &m_textShadow; }
+    void setTextShadow(const TShadow& shadow) { m_textShadow = shadow; }
 
     // Returns a copy of the vector; this record keeps ownership of the runs, which may be changed in place.
-    std::vector<TextStyle*> getTextItems() const { return mTextItems; }
+    std::vector<TextStyle*> getTextItems() const { return m_textItems; }
 
     // Takes ownership of the runs. Does NOT delete the previous ones: call releaseVectorTextStyle() first to
     // replace them.
-    void setTextItems(const std::vector<TextStyle*>& items) { mTextItems = items; }
-    void setTextItems(std::vector<TextStyle*>&& items) { mTextItems = std::move(items); }
+    void setTextItems(const std::vector<TextStyle*>& items) { m_textItems = items; }
+    void setTextItems(std::vector<TextStyle*>&& items) { m_textItems = std::move(items); }
 
     // Returns the same runs without copying the vector; valid until the runs are replaced.
-    const std::vector<TextStyle*>& textItems() const { return mTextItems; }
+    const std::vector<TextStyle*>& textItems() const { return m_textItems; }
 
     // Deletes all runs.
     void releaseVectorTextStyle();
@@ -69,13 +69,13 @@ public:
 private:
     void cloneTextItems(const std::vector<TextStyle*>& items);
 
-    int mTextObjectID;
-    std::string mText;
-    float mX;
-    float mY;
-    float mZ;
-    int mTextAlign;
-    int mShadowStyle;
-    TShadow mTextShadow;
-    std::vector<TextStyle*> mTextItems; // owned
+    int m_textObjectID;
+    std::string m_text;
+    float m_x;
+    float m_y;
+    float m_z;
+    int m_textAlign;
+    int m_shadowStyle;
+    TShadow m_textShadow;
+    std::vector<TextStyle*> m_textItems; // owned
 };

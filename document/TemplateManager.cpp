@@ -44,19 +44,19 @@ std::vector<Archive*> TemplateManager::getTemplates(emTemplateLanguage language)
     }
     if (mTemplateRootFolder.empty())
         return {};
-    mLanguageFolder =
+    m_languageFolder =
         mTemplateRootFolder + (language == TEMPLATE_LANGUAGE_EN ? TEMPLATE_RES_EN : TEMPLATE_RES_CHS);
     const QList<Archive*> templates =
-        ArchiveController().getArchiveList(QString::fromStdString(mLanguageFolder));
+        ArchiveController().getArchiveList(QString::fromStdString(m_languageFolder));
     return {templates.begin(), templates.end()};
 }
 
 std::string TemplateManager::loadLastTemplatePath()
 {
-    return LastSettingParser(mLanguageFolder).getTempAttribute(TEMP_LAST_TEMPLATE, TEMP_PATH);
+    return LastSettingParser(m_languageFolder).getTempAttribute(TEMP_LAST_TEMPLATE, TEMP_PATH);
 }
 
 int TemplateManager::saveLastTemplatePath(std::string path)
 {
-    return LastSettingParser(mLanguageFolder).editTempFile(TEMP_LAST_TEMPLATE, TEMP_PATH, path);
+    return LastSettingParser(m_languageFolder).editTempFile(TEMP_LAST_TEMPLATE, TEMP_PATH, path);
 }

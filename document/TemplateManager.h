@@ -23,5 +23,5 @@ public:
 private:
     static TemplateManager* mInstance;
     std::string mTemplateRootFolder;
-    std::string mLanguageFolder;
+    std::string m_languageFolder;
 };

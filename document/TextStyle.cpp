@@ -3,35 +3,36 @@
 #include "document/DocumentConstants.h"
 
 TextStyle::TextStyle()
-    : mText(DEFAULT_TEXT)
-    , mFontFamily(DEFAULT_FONT_FAMILY)
-    , mFontColor(DEFAULT_FONT_CORLOR)
-    , mAlphaDefaultFont(DEFAULT_FONT_FAMILY)
-    , mFontSize(96)
-    , mFontBold(0)
-    , mTextItalic(0)
-    , mTextKerning(100)
-    , mIsTextEdge(0)
+    : m_text(DEFAULT_TEXT)
+    , m_fontFamily(DEFAULT_FONT_FAMILY)
+    , m_fontColor(DEFAULT_FONT_CORLOR)
+    , m_alphaDefaultFont(DEFAULT_FONT_FAMILY)
+    , m_fontSize(96)
+    , m_fontBold(0)
+    , m_textItalic(0)
+    , m_textKerning(100)
+    , m_isTextEdge(0)
 {
 }
 
 bool TextStyle::fontIsTheSame(const TextStyle& other) const
 {
-    return mFontSize == other.mFontSize && mFontBold == other.mFontBold && mTextItalic == other.mTextItalic &&
-           mFontFamily == other.mFontFamily && mFontColor == other.mFontColor;
+    return m_fontSize == other.m_fontSize && m_fontBold == other.m_fontBold &&
+           m_textItalic == other.m_textItalic && m_fontFamily == other.m_fontFamily &&
+           m_fontColor == other.m_fontColor;
 }
 
 bool TextStyle::edgeIsTheSame(const TextStyle& other) const
 {
-    if (mIsTextEdge != other.mIsTextEdge)
+    if (m_isTextEdge != other.m_isTextEdge)
         return false;
-    return mIsTextEdge == 0 || mTextEdge == other.mTextEdge;
+    return m_isTextEdge == 0 || m_textEdge == other.m_textEdge;
 }
 
 bool TextStyle::operator==(const TextStyle& other) const
 {
     if (this == &other)
         return true;
-    return fontIsTheSame(other) && mTextKerning == other.mTextKerning && mText == other.mText &&
+    return fontIsTheSame(other) && m_textKerning == other.m_textKerning && m_text == other.m_text &&
            edgeIsTheSame(other);
 }

@@ -89,8 +89,8 @@ UserTemplateManager* UserTemplateManager::getInstance()
 {
     if (!mInstance) {
         mInstance = new UserTemplateManager;
-        mInstance->mRootFolder = userTemplatesRoot();
-        mInstance->mSettingFolder = mInstance->mRootFolder;
+        mInstance->m_rootFolder = userTemplatesRoot();
+        mInstance->m_settingFolder = mInstance->m_rootFolder;
         mInstance->reCreateNewOrderXml();
     }
     return mInstance;
@@ -104,18 +104,19 @@ void UserTemplateManager::cleanUp()
 
 std::vector<Archive*> UserTemplateManager::getTemplates(emTemplateLanguage)
 {
-    const QList<Archive*> templates = ArchiveController().getArchiveList(QString::fromStdString(mRootFolder));
+    const QList<Archive*> templates =
+        ArchiveController().getArchiveList(QString::fromStdString(m_rootFolder));
     return {templates.begin(), templates.end()};
 }
 
 std::string UserTemplateManager::loadLastTemplatePath()
 {
-    return LastSettingParser(mSettingFolder).getTempAttribute(TEMP_LAST_TEMPLATE, TEMP_PATH);
+    return LastSettingParser(m_settingFolder).getTempAttribute(TEMP_LAST_TEMPLATE, TEMP_PATH);
 }
 
 int UserTemplateManager::saveLastTemplatePath(std::string path)
 {
-    return LastSettingParser(mSettingFolder).editTempFile(TEMP_LAST_TEMPLATE, TEMP_PATH, path);
+    return LastSettingParser(m_settingFolder).editTempFile(TEMP_LAST_TEMPLATE, TEMP_PATH, path);
 }
 
 int UserTemplateManager::reCreateNewOrderXml()
@@ -126,18 +127,18 @@ int UserTemplateManager::reCreateNewOrderXml()
 
 int UserTemplateManager::makeFolderList()
 {
-    mFolderList.clear();
-    if (!isFolder(mRootFolder)) {
-        std::cout << "S16 folderPath not a directory." << mRootFolder << std::endl;
+    m_folderList.clear();
+    if (!isFolder(m_rootFolder)) {
+        std::cout << "S16 folderPath not a directory." << m_rootFolder << std::endl;
         return 0;
     }
     std::multimap<long long, std::string> byTime;
-    for (const std::string& name : entriesOf(mRootFolder)) {
+    for (const std::string& name : entriesOf(m_rootFolder)) {
         // A single name that XML cannot contain would make the whole order file unreadable.
-        if (!isEntryName(name) || !isFolder(mRootFolder + STR_SLASH + name) ||
+        if (!isEntryName(name) || !isFolder(m_rootFolder + STR_SLASH + name) ||
             !isTemplatePath(titlePathOf(name)))
             continue;
-        if (!exists(mRootFolder + STR_SLASH + name + STR_SLASH + name + XML_EXTENSION) &&
+        if (!exists(m_rootFolder + STR_SLASH + name + STR_SLASH + name + XML_EXTENSION) &&
             !exists(titlePathOf(name)))
             continue;
         struct stat status = {};
@@ -148,29 +149,29 @@ int UserTemplateManager::makeFolderList()
         byTime.emplace(timeKey(status), name);
     }
     for (const auto& [time, name] : byTime)
-        mFolderList.push_back(name);
+        m_folderList.push_back(name);
     return 1;
 }
 
 int UserTemplateManager::createNewOrderXml()
 {
     std::vector<ArchiveOrder> rows;
-    rows.reserve(mFolderList.size());
-    for (const std::string& name : mFolderList) {
+    rows.reserve(m_folderList.size());
+    for (const std::string& name : m_folderList) {
         ArchiveOrder row;
         row.setArchiveIndex(static_cast<int>(rows.size()));
         row.setArchivePath(name + STR_SLASH + TITLE_STEM + XML_EXTENSION);
         rows.push_back(row);
     }
-    if (!isFolder(mRootFolder))
+    if (!isFolder(m_rootFolder))
         return 0;
-    return FolderOrder::writeOrKeep(mRootFolder, rows) ? 1 : -1;
+    return FolderOrder::writeOrKeep(m_rootFolder, rows) ? 1 : -1;
 }
 
 int UserTemplateManager::renameInOrderXml(std::string oldName, std::string newName)
 {
-    const auto entry = std::find(mFolderList.begin(), mFolderList.end(), oldName);
-    if (entry == mFolderList.end() || !isEntryName(newName))
+    const auto entry = std::find(m_folderList.begin(), m_folderList.end(), oldName);
+    if (entry == m_folderList.end() || !isEntryName(newName))
         return 0;
     *entry = std::move(newName);
     return createNewOrderXml();
@@ -178,16 +179,16 @@ int UserTemplateManager::renameInOrderXml(std::string oldName, std::string newNa
 
 int UserTemplateManager::addNewTemplateToLastInOrderXml(std::string name)
 {
-    std::erase(mFolderList, name);
+    std::erase(m_folderList, name);
     if (isEntryName(name))
-        mFolderList.push_back(std::move(name));
+        m_folderList.push_back(std::move(name));
     createNewOrderXml();
     return 1;
 }
 
 int UserTemplateManager::removeFromOrderXml(std::string name)
 {
-    return std::erase(mFolderList, name) == 0 ? 0 : createNewOrderXml();
+    return std::erase(m_folderList, name) == 0 ? 0 : createNewOrderXml();
 }
 
 int UserTemplateManager::loadTemplate(std::string name, Archive* archive)
@@ -204,8 +205,8 @@ int UserTemplateManager::createNewTemplateXml(std::string name, Archive* archive
 {
     if (!archive)
         return 0;
-    const std::string folder = mRootFolder + STR_SLASH + name;
-    if (mRootFolder.empty() || !isEntryName(name) || !exists(folder)) {
+    const std::string folder = m_rootFolder + STR_SLASH + name;
+    if (m_rootFolder.empty() || !isEntryName(name) || !exists(folder)) {
         std::cout << "S16 folderPath not found. " << folder << std::endl;
         return 0;
     }
@@ -247,20 +248,20 @@ int UserTemplateManager::deleteTemplatePath(std::string path)
 
 std::string UserTemplateManager::titlePathOf(const std::string& name) const
 {
-    return mRootFolder + STR_SLASH + name + STR_SLASH + TITLE_STEM + XML_EXTENSION;
+    return m_rootFolder + STR_SLASH + name + STR_SLASH + TITLE_STEM + XML_EXTENSION;
 }
 
 bool UserTemplateManager::isTemplatePath(const std::string& path) const
 {
     const bool isAbsolute = path.starts_with('/');
-    return !mRootFolder.empty() &&
-           ConfinedPath::isBelow(mRootFolder, isAbsolute ? path : mRootFolder + STR_SLASH + path);
+    return !m_rootFolder.empty() &&
+           ConfinedPath::isBelow(m_rootFolder, isAbsolute ? path : m_rootFolder + STR_SLASH + path);
 }
 
 // Paths come from files and other processes, so make sure that only a template's folder is deleted.
 bool UserTemplateManager::isTemplateFolder(const std::string& folder) const
 {
-    const fs::path root = fs::path(mRootFolder).lexically_normal();
+    const fs::path root = fs::path(m_rootFolder).lexically_normal();
     return !root.empty() && fs::path(folder).parent_path() == root &&
            isEntryName(fs::path(folder).filename().string());
 }

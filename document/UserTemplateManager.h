@@ -69,7 +69,7 @@ private:
     bool isTemplateFolder(const std::string& folder) const;
 
     static UserTemplateManager* mInstance;
-    std::string mRootFolder;
-    std::string mSettingFolder; // folder of the file with the last template; equals mRootFolder
-    std::vector<std::string> mFolderList;
+    std::string m_rootFolder;
+    std::string m_settingFolder; // folder of the file with the last template; equals m_rootFolder
+    std::vector<std::string> m_folderList;
 };

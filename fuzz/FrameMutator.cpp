@@ -12,41 +12,41 @@ namespace
 class Mutation
 {
 public:
-    Mutation(std::vector<FrameCall>& calls, unsigned seed) : mCalls(calls), mRandom(seed) {}
+    Mutation(std::vector<FrameCall>& calls, unsigned seed) : m_calls(calls), m_random(seed) {}
 
     void run()
     {
-        if (mCalls.empty())
-            mCalls.emplace_back();
-        const std::size_t at = below(mCalls.size());
+        if (m_calls.empty())
+            m_calls.emplace_back();
+        const std::size_t at = below(m_calls.size());
         switch (below(8)) {
         case 0: {
-            const FrameCall copy = mCalls[at];
-            mCalls.insert(mCalls.begin() + std::ptrdiff_t(below(mCalls.size() + 1)), copy);
+            const FrameCall copy = m_calls[at];
+            m_calls.insert(m_calls.begin() + std::ptrdiff_t(below(m_calls.size() + 1)), copy);
             return;
         }
         case 1:
-            mCalls.erase(mCalls.begin() + std::ptrdiff_t(at));
+            m_calls.erase(m_calls.begin() + std::ptrdiff_t(at));
             return;
         case 2:
-            std::swap(mCalls[at], mCalls[below(mCalls.size())]);
+            std::swap(m_calls[at], m_calls[below(m_calls.size())]);
             return;
         case 3:
-            mCalls[at].object = std::uint8_t(below(16));
+            m_calls[at].object = std::uint8_t(below(16));
             return;
         case 4:
-            mCalls[at].method = std::uint8_t(below(10));
+            m_calls[at].method = std::uint8_t(below(10));
             return;
         case 5:
-            mCalls[at].flags ^= std::uint8_t(1U << below(5));
+            m_calls[at].flags ^= std::uint8_t(1U << below(5));
             return;
         default:
-            changePayload(mCalls[at].payload);
+            changePayload(m_calls[at].payload);
         }
     }
 
 private:
-    std::size_t below(std::size_t bound) { return bound == 0 ? 0 : mRandom() % bound; }
+    std::size_t below(std::size_t bound) { return bound == 0 ? 0 : m_random() % bound; }
 
     // Writes one packed value at a random place, mostly at the end: a small number, a number of a certain
     // width, or a string.
@@ -76,8 +76,8 @@ private:
         payload.insert(payload.begin() + std::ptrdiff_t(at), value.begin(), value.end());
     }
 
-    std::vector<FrameCall>& mCalls;
-    std::mt19937 mRandom;
+    std::vector<FrameCall>& m_calls;
+    std::mt19937 m_random;
 };
 
 } // namespace

@@ -22,7 +22,7 @@ public:
     }
 
     // Returns the folder that the paths in the path file are relative to, without a slash at its end.
-    std::string base() const { return mRoot + "/defaultuser"; }
+    std::string base() const { return m_root + "/defaultuser"; }
 
     static void write(const std::string& path, std::string_view bytes)
     {
@@ -57,10 +57,10 @@ private:
             std::string(::access(memory, W_OK) == 0 ? memory : "/tmp") + "/titler-fuzz-XXXXXX";
         if (!::mkdtemp(pattern.data()))
             std::abort();
-        mRoot = pattern;
+        m_root = pattern;
         ::setenv("K2SYS_AC_ROOT", "", 1);
-        ::setenv("K2SYS_AC_DATA", mRoot.c_str(), 1);
-        ::setenv("K2SYS_LOG_DIR", mRoot.c_str(), 1);
+        ::setenv("K2SYS_AC_DATA", m_root.c_str(), 1);
+        ::setenv("K2SYS_LOG_DIR", m_root.c_str(), 1);
         for (const char* folder : {"/titles", "/settings", "/usertemplates", "/templates/templates_en",
                                    "/templates/templates_chs", "/resources/Templates"})
             std::filesystem::create_directories(base() + folder);
@@ -72,8 +72,8 @@ private:
     ~FuzzFolder()
     {
         std::error_code error;
-        std::filesystem::remove_all(mRoot, error);
+        std::filesystem::remove_all(m_root, error);
     }
 
-    std::string mRoot;
+    std::string m_root;
 };

@@ -32,11 +32,11 @@ public:
         auto receiver = std::make_unique<PTC::QtReceiver>(RECEIVER);
         auto* titler = new TitlerAdapter(TitlerAdapter::INTERFACE_ID);
         titler->setProxyFactory(this);
-        titler->setTarget(static_cast<ITitler*>(&mSink));
+        titler->setTarget(static_cast<ITitler*>(&m_sink));
         receiver->addAdapter(titler);
-        mReceiver = receiver.get();
+        m_receiver = receiver.get();
         addAdapters();
-        mRemote.addReceiver(receiver.release());
+        m_remote.addReceiver(receiver.release());
     }
 
     // Handles the bytes that a peer sends before it disconnects, MOST_BYTES at most.
@@ -55,30 +55,30 @@ public:
             bytes.remove_prefix(static_cast<std::size_t>(sent));
         }
         ::shutdown(ends[0], SHUT_WR);
-        mRemote.ThreadMain(ends[1]);
+        m_remote.ThreadMain(ends[1]);
         ::close(ends[0]);
         ::close(ends[1]);
         QCoreApplication::sendPostedEvents();
     }
 
-    const ServiceSink& sink() const { return mSink; }
+    const ServiceSink& sink() const { return m_sink; }
 
 private:
     template <typename Service, typename CallBack>
     void addCallBack()
     {
-        add(Service::CALLBACK_ADAPTER_TYPE, static_cast<CallBack*>(&mSink));
+        add(Service::CALLBACK_ADAPTER_TYPE, static_cast<CallBack*>(&m_sink));
     }
     template <typename Service, typename Notify>
     void addNotify()
     {
-        add(Service::NOTIFY_ADAPTER_TYPE, static_cast<Notify*>(&mSink));
+        add(Service::NOTIFY_ADAPTER_TYPE, static_cast<Notify*>(&m_sink));
     }
     void add(long type, void* target)
     {
-        PTC::IAdapterBase* adapter = ServiceFamilies::createAdapter(type, mNextId++);
+        PTC::IAdapterBase* adapter = ServiceFamilies::createAdapter(type, m_nextId++);
         adapter->setTarget(target);
-        mReceiver->addCBAdapter(adapter);
+        m_receiver->addCBAdapter(adapter);
     }
     void addAdapters()
     {
@@ -105,10 +105,10 @@ private:
         return isKnown ? new TitlerCallBackRemoteProxy(id) : nullptr;
     }
 
-    ServiceSink mSink;
-    SocketRemoteReceiver mRemote{0};
-    PTC::QtReceiver* mReceiver = nullptr; // owned by mRemote
-    long mNextId = 0;
+    ServiceSink m_sink;
+    SocketRemoteReceiver m_remote{0};
+    PTC::QtReceiver* m_receiver = nullptr; // owned by m_remote
+    long m_nextId = 0;
 };
 
 // Returns the chain of the process, with an application, which posted events need.

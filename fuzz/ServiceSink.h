@@ -32,17 +32,17 @@ class ServiceSink : public ITitler,
                     public ISystemSetupManagerNotify
 {
 public:
-    void registerCallBack(ITitlerCallBack* target) override { mCallBack.reset(target); }
-    void showTitlerCreate(_CALL_TITLER_TYPE) override { ++mCalls; }
+    void registerCallBack(ITitlerCallBack* target) override { m_callBack.reset(target); }
+    void showTitlerCreate(_CALL_TITLER_TYPE) override { ++m_calls; }
     void showTitlerEdit(_SHOW_TITLER_PARAMTER p) override { see(p.path); }
-    void showDialogMaskWidget(bool) override { ++mCalls; }
-    void showMessageMaskWidget(bool) override { ++mCalls; }
+    void showDialogMaskWidget(bool) override { ++m_calls; }
+    void showMessageMaskWidget(bool) override { ++m_calls; }
 
-    void setClientID(int) override { ++mCalls; }
-    void getClientID(int) override { ++mCalls; }
-    void postAPPEventFilterNotify(APPEventDefine::_tagAPPEvent) override { ++mCalls; }
-    void postRestoreOriginalNotify(APPEventDefine::_tagAPPEvent) override { ++mCalls; }
-    void postRestoreFocusNotify() override { ++mCalls; }
+    void setClientID(int) override { ++m_calls; }
+    void getClientID(int) override { ++m_calls; }
+    void postAPPEventFilterNotify(APPEventDefine::_tagAPPEvent) override { ++m_calls; }
+    void postRestoreOriginalNotify(APPEventDefine::_tagAPPEvent) override { ++m_calls; }
+    void postRestoreFocusNotify() override { ++m_calls; }
     void importNotify(FileManagerDefine::tagImportNotify p) override
     {
         see(p.path);
@@ -61,45 +61,45 @@ public:
         see(p.oldPath);
         see(p.newPath);
     }
-    void getTopWindowCallBack(int) override { ++mCalls; }
-    void getTopWindowNotify(int) override { ++mCalls; }
+    void getTopWindowCallBack(int) override { ++m_calls; }
+    void getTopWindowNotify(int) override { ++m_calls; }
     void postMessageNotify(MessageDefine::_tagMessageParam p) override
     {
         see(p.first);
         see(p.text);
     }
-    void closeMessageNotify(MessageDefine::_tagCloseParam) override { ++mCalls; }
-    void showBarNotify(int) override { ++mCalls; }
-    void powerOff() override { ++mCalls; }
-    void powerOn() override { ++mCalls; }
-    void loadNotify(int) override { ++mCalls; }
-    void showTitler() override { ++mCalls; }
+    void closeMessageNotify(MessageDefine::_tagCloseParam) override { ++m_calls; }
+    void showBarNotify(int) override { ++m_calls; }
+    void powerOff() override { ++m_calls; }
+    void powerOn() override { ++m_calls; }
+    void loadNotify(int) override { ++m_calls; }
+    void showTitler() override { ++m_calls; }
     void sendInputString(std::wstring text) override { see(text); }
     void sendInputStringOnEnterPressing(std::wstring text) override { see(text); }
     void sendInputStringOnTextChanged(std::wstring text) override { see(text); }
     void sendKey(SubCommonDefine::tagSoftKeyBoardKeyData key) override { see(key.text); }
     void sendInputStringSelectionPos(SubCommonDefine::tagSoftKeyBoardKeyTextSelectionPos) override
     {
-        ++mCalls;
+        ++m_calls;
     }
-    void sendSoftKeyboardState(bool) override { ++mCalls; }
-    void getLanguageInfoCallBack(SystemSetupDef::tagSystemLanguageParam) override { ++mCalls; }
-    void getInformationCallBack(SystemSetupDef::tagSystemInformation) override { ++mCalls; }
-    void setSystemLanguageNotify(int) override { ++mCalls; }
-    void setInputLanguageNotify(int) override { ++mCalls; }
+    void sendSoftKeyboardState(bool) override { ++m_calls; }
+    void getLanguageInfoCallBack(SystemSetupDef::tagSystemLanguageParam) override { ++m_calls; }
+    void getInformationCallBack(SystemSetupDef::tagSystemInformation) override { ++m_calls; }
+    void setSystemLanguageNotify(int) override { ++m_calls; }
+    void setInputLanguageNotify(int) override { ++m_calls; }
 
-    long calls() const { return mCalls; }
+    long calls() const { return m_calls; }
 
 private:
     void see(const std::wstring& text)
     {
-        ++mCalls;
-        mSum = std::accumulate(text.begin(), text.end(), mSum, [](unsigned long sum, wchar_t sign) {
+        ++m_calls;
+        m_sum = std::accumulate(text.begin(), text.end(), m_sum, [](unsigned long sum, wchar_t sign) {
             return sum * 31 + static_cast<unsigned>(sign);
         });
     }
 
-    long mCalls = 0;
-    unsigned long mSum = 0;
-    std::unique_ptr<ITitlerCallBack> mCallBack;
+    long m_calls = 0;
+    unsigned long m_sum = 0;
+    std::unique_ptr<ITitlerCallBack> m_callBack;
 };

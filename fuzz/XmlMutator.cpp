@@ -29,13 +29,13 @@ constexpr int DEEPEST = 80; // slightly deeper than the program accepts
 class Reader
 {
 public:
-    explicit Reader(std::string_view text) : mRest(text) {}
+    explicit Reader(std::string_view text) : m_rest(text) {}
 
     ElementPointer read()
     {
         while (skipTo('<'))
-            if (mRest.size() > 1 && (mRest[1] == '?' || mRest[1] == '!'))
-                mRest.remove_prefix(1);
+            if (m_rest.size() > 1 && (m_rest[1] == '?' || m_rest[1] == '!'))
+                m_rest.remove_prefix(1);
             else
                 return element(0);
         return nullptr;
@@ -44,27 +44,27 @@ public:
 private:
     bool skipTo(char sign)
     {
-        const std::size_t at = mRest.find(sign);
-        mRest.remove_prefix(std::min(at, mRest.size()));
-        return !mRest.empty();
+        const std::size_t at = m_rest.find(sign);
+        m_rest.remove_prefix(std::min(at, m_rest.size()));
+        return !m_rest.empty();
     }
     void skipBlanks()
     {
-        while (!mRest.empty() && std::strchr(" \t\r\n", mRest.front()))
-            mRest.remove_prefix(1);
+        while (!m_rest.empty() && std::strchr(" \t\r\n", m_rest.front()))
+            m_rest.remove_prefix(1);
     }
     std::string word()
     {
-        const std::size_t end = std::min(mRest.find_first_of(" \t\r\n=/><"), mRest.size());
-        std::string result(mRest.substr(0, end));
-        mRest.remove_prefix(end);
+        const std::size_t end = std::min(m_rest.find_first_of(" \t\r\n=/><"), m_rest.size());
+        std::string result(m_rest.substr(0, end));
+        m_rest.remove_prefix(end);
         return result;
     }
     bool take(std::string_view token)
     {
-        if (!mRest.starts_with(token))
+        if (!m_rest.starts_with(token))
             return false;
-        mRest.remove_prefix(token.size());
+        m_rest.remove_prefix(token.size());
         return true;
     }
     bool attribute(Element& owner)
@@ -74,13 +74,13 @@ private:
         if (key.empty() || !take("="))
             return false;
         skipBlanks();
-        if (mRest.empty() || (mRest.front() != '"' && mRest.front() != '\''))
+        if (m_rest.empty() || (m_rest.front() != '"' && m_rest.front() != '\''))
             return false;
-        const std::size_t end = mRest.find(mRest.front(), 1);
+        const std::size_t end = m_rest.find(m_rest.front(), 1);
         if (end == std::string_view::npos)
             return false;
-        owner.attributes.emplace_back(key, mRest.substr(1, end - 1));
-        mRest.remove_prefix(end + 1);
+        owner.attributes.emplace_back(key, m_rest.substr(1, end - 1));
+        m_rest.remove_prefix(end + 1);
         return true;
     }
     ElementPointer element(int depth)
@@ -104,10 +104,10 @@ private:
     ElementPointer content(ElementPointer owner, int depth)
     {
         for (;;) {
-            const std::size_t end = std::min(mRest.find('<'), mRest.size());
-            owner->text += mRest.substr(0, end);
-            mRest.remove_prefix(end);
-            if (mRest.empty())
+            const std::size_t end = std::min(m_rest.find('<'), m_rest.size());
+            owner->text += m_rest.substr(0, end);
+            m_rest.remove_prefix(end);
+            if (m_rest.empty())
                 return nullptr;
             if (take("</")) {
                 skipTo('>');
@@ -121,7 +121,7 @@ private:
         }
     }
 
-    std::string_view mRest;
+    std::string_view m_rest;
 };
 
 void print(const Element& element, std::string& text)
@@ -238,7 +238,7 @@ const char* const VALUES[] = {"",
 class Mutation
 {
 public:
-    Mutation(Element& root, unsigned seed) : mRandom(seed) { collect(root, mAll); }
+    Mutation(Element& root, unsigned seed) : m_random(seed) { collect(root, m_all); }
 
     void run()
     {
@@ -264,8 +264,8 @@ public:
     }
 
 private:
-    std::size_t below(std::size_t bound) { return bound == 0 ? 0 : mRandom() % bound; }
-    Element& any() { return *mAll[below(mAll.size())]; }
+    std::size_t below(std::size_t bound) { return bound == 0 ? 0 : m_random() % bound; }
+    Element& any() { return *m_all[below(m_all.size())]; }
 
     void duplicate()
     {
@@ -337,8 +337,8 @@ private:
             value = VALUES[below(std::size(VALUES))];
     }
 
-    std::mt19937 mRandom;
-    std::vector<Element*> mAll;
+    std::mt19937 m_random;
+    std::vector<Element*> m_all;
 };
 
 } // namespace

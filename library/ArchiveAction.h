@@ -18,13 +18,13 @@ public:
     };
 
     ArchiveAction(const QString& text, ARCHIVE_ACTION_TYPE type, QObject* parent)
-        : QAction(text, parent), mType(type)
+        : QAction(text, parent), m_type(type)
     {
     }
 
-    ARCHIVE_ACTION_TYPE getActionType() const { return mType; }
-    void setActionType(ARCHIVE_ACTION_TYPE type) { mType = type; }
+    ARCHIVE_ACTION_TYPE getActionType() const { return m_type; }
+    void setActionType(ARCHIVE_ACTION_TYPE type) { m_type = type; }
 
 private:
-    ARCHIVE_ACTION_TYPE mType;
+    ARCHIVE_ACTION_TYPE m_type;
 };

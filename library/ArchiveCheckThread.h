@@ -37,10 +37,10 @@ protected:
 private:
     QSet<std::size_t> unreadableIn(std::size_t first, std::size_t count) const;
 
-    std::shared_ptr<const FolderTitles> mTitles;
-    std::size_t mFirst;
-    bool mHasBegun = false;
-    std::atomic<bool> mCancelled{false};
-    QMutex mMutex; // guards mUnreadable
-    QSet<std::size_t> mUnreadable;
+    std::shared_ptr<const FolderTitles> m_titles;
+    std::size_t m_first;
+    bool m_hasBegun = false;
+    std::atomic<bool> m_cancelled{false};
+    QMutex m_mutex; // guards m_unreadable
+    QSet<std::size_t> m_unreadable;
 };

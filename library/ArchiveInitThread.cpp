@@ -8,7 +8,7 @@
 #include <utility>
 
 ArchiveInitThread::ArchiveInitThread(QString folder, QObject* parent)
-    : QThread(parent), mFolder(std::move(folder))
+    : QThread(parent), m_folder(std::move(folder))
 {
 }
 
@@ -16,22 +16,22 @@ ArchiveInitThread::~ArchiveInitThread()
 {
     cancel();
     wait();
-    QMutexLocker lock(&mMutex);
-    qDeleteAll(mArchives);
-    mArchives.clear();
+    QMutexLocker lock(&m_mutex);
+    qDeleteAll(m_archives);
+    m_archives.clear();
 }
 
 void ArchiveInitThread::run()
 {
     AlternateStack::useInThisThread();
-    QList<Archive*> archives = mController.getArchiveList(mFolder);
+    QList<Archive*> archives = m_controller.getArchiveList(m_folder);
     {
         // Unlocked before the signal is emitted, which blocks until the GUI thread has handled it.
-        QMutexLocker lock(&mMutex);
+        QMutexLocker lock(&m_mutex);
         const QMetaMethod finished =
             QMetaMethod::fromSignal(&ArchiveInitThread::threadGetArchiveListFinished);
-        if (mCancelled || !isSignalConnected(finished)) {
-            mArchives = archives;
+        if (m_cancelled || !isSignalConnected(finished)) {
+            m_archives = archives;
             return;
         }
     }

@@ -22,7 +22,7 @@ public:
 
     // Stops the announcement of the titles. The signal may be on its way already: the receiver has to go on
     // handling events until the thread has finished. Any thread.
-    void cancel() { mCancelled = true; }
+    void cancel() { m_cancelled = true; }
 
 Q_SIGNALS:
     // Passes the records to the receiver. Emitted by this thread, to be connected with
@@ -33,9 +33,9 @@ protected:
     void run() override;
 
 private:
-    ArchiveController mController;
-    QString mFolder;
-    QMutex mMutex; // guards mArchives
-    QList<Archive*> mArchives;
-    std::atomic<bool> mCancelled{false};
+    ArchiveController m_controller;
+    QString m_folder;
+    QMutex m_mutex; // guards m_archives
+    QList<Archive*> m_archives;
+    std::atomic<bool> m_cancelled{false};
 };

@@ -73,9 +73,9 @@ QBrush checkerBrush()
 } // namespace
 
 ArchiveItem::ArchiveItem(Archive* archive, int type, QWidget* parent)
-    : KSBaseItemWidget(parent), mArchive(archive), mType(type)
+    : KSBaseItemWidget(parent), m_archive(archive), m_type(type)
 {
-    setFixedSize(mType == NARROW_ITEM ? RIGHT_CHILD_WIDTH : WIDGET_WIDTH, WIDGET_HEIGHT);
+    setFixedSize(m_type == NARROW_ITEM ? RIGHT_CHILD_WIDTH : WIDGET_WIDTH, WIDGET_HEIGHT);
     setStyleSheet(UN_OPERATE_AND_UN_SELECT_STATE);
 }
 
@@ -83,30 +83,30 @@ ArchiveItem::~ArchiveItem() = default;
 
 QString ArchiveItem::getArchiveDataPath() const
 {
-    return mArchive ? QString::fromStdString(mArchive->getPath()) : QString();
+    return m_archive ? QString::fromStdString(m_archive->getPath()) : QString();
 }
 
 void ArchiveItem::discard()
 {
-    mArchive = nullptr;
+    m_archive = nullptr;
     hide();
     deleteLater();
 }
 
 void ArchiveItem::updateArchiveData(Archive* archive)
 {
-    if (!archive || !mArchive)
+    if (!archive || !m_archive)
         return;
-    const std::string name = mArchive->getName();
-    *mArchive = *archive;
-    mArchive->setName(name);
+    const std::string name = m_archive->getName();
+    *m_archive = *archive;
+    m_archive->setName(name);
 }
 
 void ArchiveItem::initArchiveItemChildWidget(const QImage& picture)
 {
     if (hasChildWidgets())
         return;
-    if (mType == LIST_ITEM)
+    if (m_type == LIST_ITEM)
         createLeftChild();
     createRightChild();
     updateLeftChild(picture);
@@ -124,26 +124,26 @@ void ArchiveItem::setDragFlag(bool dragFlag)
 // Limits the text lines to the space before the handle.
 void ArchiveItem::fitLinesToHandle()
 {
-    if (mType != LIST_ITEM || !hasChildWidgets())
+    if (m_type != LIST_ITEM || !hasChildWidgets())
         return;
     const bool hasHandle = hasDragFlag() && getDragFlagAlignment() == DRAGFLAG_RIGHT;
     const int width =
         hasHandle ? getHandlePos().x() - HANDLE_GAP - RIGHT_CHILD_POS.x() : DISPLY_TEXT_SIZE_LENTH;
-    if (mLabels.first()->width() == width)
+    if (m_labels.first()->width() == width)
         return;
-    for (QLabel* label : mLabels)
+    for (QLabel* label : m_labels)
         label->setFixedWidth(width);
     updateRightChild();
 }
 
 void ArchiveItem::createLeftChild()
 {
-    mScene = new QGraphicsScene(0, 0, LEFT_CHILD_WIDTH, CHILD_HEIGHT, this);
-    mScene->setBackgroundBrush(checkerBrush());
-    mPixmapItem = mScene->addPixmap(QPixmap());
+    m_scene = new QGraphicsScene(0, 0, LEFT_CHILD_WIDTH, CHILD_HEIGHT, this);
+    m_scene->setBackgroundBrush(checkerBrush());
+    m_pixmapItem = m_scene->addPixmap(QPixmap());
     // The parent and the style sheet are set first: a widget is styled again, with its children, when either
     // changes later.
-    auto* view = new QGraphicsView(mScene, this);
+    auto* view = new QGraphicsView(m_scene, this);
     view->setStyleSheet(QStringLiteral("border:0;"));
     view->setEnabled(false);
     view->setHorizontalScrollBarPolicy(Qt::ScrollBarAlwaysOff);
@@ -156,19 +156,19 @@ void ArchiveItem::createLeftChild()
 
 void ArchiveItem::createRightChild()
 {
-    const bool narrow = mType == NARROW_ITEM;
-    mTextWidget = new QWidget(this);
-    setChild(mTextWidget, CHILD_RIGHT);
-    mTextWidget->setObjectName(QStringLiteral("mTextWidget"));
+    const bool narrow = m_type == NARROW_ITEM;
+    m_textWidget = new QWidget(this);
+    setChild(m_textWidget, CHILD_RIGHT);
+    m_textWidget->setObjectName(QStringLiteral("mTextWidget"));
     if (narrow)
-        mTextWidget->setStyleSheet(QStringLiteral(" QWidget#mTextWidget { background:rgb(38, 38, 38); }"));
-    mTextWidget->setFixedSize(RIGHT_CHILD_WIDTH, CHILD_HEIGHT);
-    mTextWidget->move(narrow ? QPoint(0, RIGHT_CHILD_POS.y()) : RIGHT_CHILD_POS);
+        m_textWidget->setStyleSheet(QStringLiteral(" QWidget#mTextWidget { background:rgb(38, 38, 38); }"));
+    m_textWidget->setFixedSize(RIGHT_CHILD_WIDTH, CHILD_HEIGHT);
+    m_textWidget->move(narrow ? QPoint(0, RIGHT_CHILD_POS.y()) : RIGHT_CHILD_POS);
 
     const QSize line =
         narrow ? QSize(NARROW_LABEL_WIDTH, NARROW_LABEL_HEIGHT) : QSize(DISPLY_TEXT_SIZE_LENTH, LABEL_HEIGHT);
     for (int i = 0; i < LEFT_CHILD_LABEL_COUNT; ++i) {
-        auto* label = new QLabel(mTextWidget);
+        auto* label = new QLabel(m_textWidget);
         label->setTextFormat(Qt::PlainText);
         label->setStyleSheet(narrow ? QStringLiteral(" background: transparent; color:rgb(178, 178, 178);")
                                     : QStringLiteral(" background: transparent; color:rgb(220, 220, 220);"));
@@ -176,9 +176,9 @@ void ArchiveItem::createRightChild()
         if (narrow)
             label->setContentsMargins(NARROW_PADDING_X, 0, NARROW_PADDING_X, 0);
         label->move(0, (narrow ? NARROW_PADDING_TOP : 0) + i * line.height());
-        mLabels.append(label);
+        m_labels.append(label);
     }
-    mTextWidget->show();
+    m_textWidget->show();
 }
 
 void ArchiveItem::updateContents(QImage image)
@@ -193,13 +193,13 @@ void ArchiveItem::updateContents(QImage image)
 
 void ArchiveItem::updateLeftChild(QImage image)
 {
-    if (!mPixmapItem || !mArchive)
+    if (!m_pixmapItem || !m_archive)
         return;
     if (image.isNull())
-        image = SmallPictures::read(mArchive->getFullPathOfThumbnailSmall(), PICTURE_SIZE);
+        image = SmallPictures::read(m_archive->getFullPathOfThumbnailSmall(), PICTURE_SIZE);
     else
         image = SmallPictures::fitted(image, PICTURE_SIZE);
-    mPixmapItem->setPixmap(image.isNull() ? QPixmap() : QPixmap::fromImage(image));
+    m_pixmapItem->setPixmap(image.isNull() ? QPixmap() : QPixmap::fromImage(image));
 }
 
 void ArchiveItem::updateRightChild()
@@ -207,8 +207,8 @@ void ArchiveItem::updateRightChild()
     if (!hasChildWidgets())
         return;
     QFont font(SYSTEM_FONT_FAMILY);
-    font.setPixelSize(mType == NARROW_ITEM ? NARROW_LABEL_HEIGHT - 4 : DISPLY_TEXT_SIZE);
-    for (QLabel* label : mLabels) {
+    font.setPixelSize(m_type == NARROW_ITEM ? NARROW_LABEL_HEIGHT - 4 : DISPLY_TEXT_SIZE);
+    for (QLabel* label : m_labels) {
         label->setFont(font);
         label->clear();
     }
@@ -229,9 +229,9 @@ void ArchiveItem::placeLine(QLabel* label) const
 
 void ArchiveItem::setTextArea()
 {
-    if (!mArchive)
+    if (!m_archive)
         return;
-    const std::vector<TText*>& texts = mArchive->text();
+    const std::vector<TText*>& texts = m_archive->text();
     if (texts.size() == 1)
         setOneTextArea(QString::fromStdString(texts.front()->getText()));
     else if (texts.size() > 1)
@@ -242,17 +242,17 @@ void ArchiveItem::setTextArea()
 void ArchiveItem::setOneTextArea(const QString& text)
 {
     const QString words = text.simplified();
-    QTextLayout layout(words, mLabels.first()->font());
+    QTextLayout layout(words, m_labels.first()->font());
     QTextOption wrapping;
     wrapping.setWrapMode(QTextOption::WrapAtWordBoundaryOrAnywhere);
     layout.setTextOption(wrapping);
     layout.beginLayout();
-    for (QLabel* label : mLabels) {
+    for (QLabel* label : m_labels) {
         QTextLine line = layout.createLine();
         if (!line.isValid())
             break;
         line.setLineWidth(label->contentsRect().width());
-        const bool isLast = label == mLabels.last();
+        const bool isLast = label == m_labels.last();
         setLabelText(words.mid(line.textStart(), isLast ? -1 : line.textLength()).trimmed(), label);
     }
     layout.endLayout();
@@ -260,14 +260,14 @@ void ArchiveItem::setOneTextArea(const QString& text)
 
 void ArchiveItem::setManyTextArea()
 {
-    std::vector<TText*> texts = mArchive->getText();
+    std::vector<TText*> texts = m_archive->getText();
     std::stable_sort(texts.begin(), texts.end(), [](const TText* left, const TText* right) {
         return left->getTextObjectID() < right->getTextObjectID();
     });
-    const qsizetype lines = std::min<qsizetype>(mLabels.size(), static_cast<qsizetype>(texts.size()));
+    const qsizetype lines = std::min<qsizetype>(m_labels.size(), static_cast<qsizetype>(texts.size()));
     for (qsizetype i = 0; i < lines; ++i)
         setLabelText(QString::fromStdString(texts[static_cast<size_t>(i)]->getText()).simplified(),
-                     mLabels.at(i));
+                     m_labels.at(i));
 }
 
 void ArchiveItem::setLabelText(const QString& text, QLabel* label)
@@ -279,12 +279,12 @@ void ArchiveItem::setLabelText(const QString& text, QLabel* label)
 
 ArchiveItem* ArchiveItem::clone()
 {
-    auto archive = mArchive ? std::make_unique<Archive>(*mArchive) : std::make_unique<Archive>();
-    auto* item = new ArchiveItem(archive.get(), mType);
-    item->mOwnArchive = std::move(archive);
+    auto archive = m_archive ? std::make_unique<Archive>(*m_archive) : std::make_unique<Archive>();
+    auto* item = new ArchiveItem(archive.get(), m_type);
+    item->m_ownArchive = std::move(archive);
     item->initArchiveItemChildWidget();
-    if (mPixmapItem && item->mPixmapItem)
-        item->mPixmapItem->setPixmap(mPixmapItem->pixmap()); // the pixmap may be newer than the file
+    if (m_pixmapItem && item->m_pixmapItem)
+        item->m_pixmapItem->setPixmap(m_pixmapItem->pixmap()); // the pixmap may be newer than the file
     item->setSelected(isSelected());
     item->setStyleSheet(isSelected() ? OPERATE_AND_SELECT_STATE : OPERATE_AND_UN_SELECT_STATE);
     return item;

@@ -45,25 +45,25 @@ public:
     ArchiveItem(Archive* archive, int type, QWidget* parent = nullptr);
     ~ArchiveItem() override;
 
-    Archive* getArchiveData() const { return mArchive; }
+    Archive* getArchiveData() const { return m_archive; }
     // Detaches the item from its record at once, and deletes it later, when no event is being delivered to
     // it.
     void discard();
     // Returns whether the item is not null and not discarded.
-    static bool isUsable(const ArchiveItem* item) { return item && item->mArchive; }
+    static bool isUsable(const ArchiveItem* item) { return item && item->m_archive; }
     QString getArchiveDataPath() const;
     // Copies the contents of the given record, but keeps the name in the item's record.
     void updateArchiveData(Archive* archive);
 
     // Prevents the list from giving the item back; see HeldArchiveItem.
-    void hold() { ++mHolds; }
-    void letGo() { --mHolds; }
-    bool isHeld() const { return mHolds > 0; }
+    void hold() { ++m_holds; }
+    void letGo() { --m_holds; }
+    bool isHeld() const { return m_holds > 0; }
 
     // Builds the thumbnail and the text lines. Reads the picture file when no picture is given, so the list
     // calls it only for items on screen.
     void initArchiveItemChildWidget(const QImage& picture = QImage());
-    bool hasChildWidgets() const { return mTextWidget != nullptr; }
+    bool hasChildWidgets() const { return m_textWidget != nullptr; }
 
     void updateContents(QImage image);
     // Shows the image; for a null image the title's small picture from its file, or only the checker pattern
@@ -91,12 +91,12 @@ private:
     void setManyTextArea();
     void setLabelText(const QString& text, QLabel* label);
 
-    Archive* mArchive;
-    std::unique_ptr<Archive> mOwnArchive; // set in clones only
-    int mType;
-    int mHolds = 0;
-    QGraphicsScene* mScene = nullptr;
-    QGraphicsPixmapItem* mPixmapItem = nullptr;
-    QWidget* mTextWidget = nullptr;
-    QList<QLabel*> mLabels;
+    Archive* m_archive;
+    std::unique_ptr<Archive> m_ownArchive; // set in clones only
+    int m_type;
+    int m_holds = 0;
+    QGraphicsScene* m_scene = nullptr;
+    QGraphicsPixmapItem* m_pixmapItem = nullptr;
+    QWidget* m_textWidget = nullptr;
+    QList<QLabel*> m_labels;
 };

@@ -8,7 +8,7 @@
 #include <algorithm>
 #include <utility>
 
-ArchiveItems::ArchiveItems(QWidget* list) : mList(list)
+ArchiveItems::ArchiveItems(QWidget* list) : m_list(list)
 {
 }
 
@@ -16,20 +16,20 @@ ArchiveItems::~ArchiveItems() = default;
 
 ArchiveItem* ArchiveItems::make(Archive* record)
 {
-    auto* item = new ArchiveItem(record, ArchiveItem::LIST_ITEM, mList);
-    mItems.append(item);
+    auto* item = new ArchiveItem(record, ArchiveItem::LIST_ITEM, m_list);
+    m_items.append(item);
     return item;
 }
 
 Archive* ArchiveItems::own(std::unique_ptr<Archive> record)
 {
-    mRecords.push_back(std::move(record));
-    return mRecords.back().get();
+    m_records.push_back(std::move(record));
+    return m_records.back().get();
 }
 
 ArchiveItem* ArchiveItems::find(const QString& path) const
 {
-    for (ArchiveItem* item : mItems)
+    for (ArchiveItem* item : m_items)
         if (item->getArchiveDataPath() == path)
             return item;
     return nullptr;
@@ -37,43 +37,43 @@ ArchiveItem* ArchiveItems::find(const QString& path) const
 
 QList<ArchiveItem*> ArchiveItems::beginToComplete()
 {
-    mIncomplete.clear();
+    m_incomplete.clear();
     QStringList paths;
-    for (ArchiveItem* item : std::as_const(mItems)) {
+    for (ArchiveItem* item : std::as_const(m_items)) {
         if (item->hasChildWidgets())
             continue;
-        mIncomplete.append(item);
+        m_incomplete.append(item);
         paths.append(item->getArchiveData()->getFullPathOfThumbnailSmall());
     }
-    mPictures.reset();
+    m_pictures.reset();
     if (!paths.isEmpty())
-        mPictures = std::make_unique<SmallPictures>(paths, ArchiveItem::PICTURE_SIZE);
-    return mIncomplete;
+        m_pictures = std::make_unique<SmallPictures>(paths, ArchiveItem::PICTURE_SIZE);
+    return m_incomplete;
 }
 
 void ArchiveItems::complete(ArchiveItem* item)
 {
-    if (!mItems.contains(item))
+    if (!m_items.contains(item))
         return;
-    const qsizetype place = mIncomplete.indexOf(item);
+    const qsizetype place = m_incomplete.indexOf(item);
     if (!item->hasChildWidgets())
-        item->initArchiveItemChildWidget(place >= 0 ? mPictures->take(place) : QImage());
-    if (place >= 0 && place == mIncomplete.size() - 1) {
-        mPictures.reset();
-        mIncomplete.clear();
+        item->initArchiveItemChildWidget(place >= 0 ? m_pictures->take(place) : QImage());
+    if (place >= 0 && place == m_incomplete.size() - 1) {
+        m_pictures.reset();
+        m_incomplete.clear();
     }
 }
 
 std::unique_ptr<Archive> ArchiveItems::take(ArchiveItem* item)
 {
-    mItems.removeOne(item);
-    const auto found = std::find_if(mRecords.begin(), mRecords.end(), [item](const auto& record) {
+    m_items.removeOne(item);
+    const auto found = std::find_if(m_records.begin(), m_records.end(), [item](const auto& record) {
         return record.get() == item->getArchiveData();
     });
     std::unique_ptr<Archive> record;
-    if (found != mRecords.end()) {
+    if (found != m_records.end()) {
         record = std::move(*found);
-        mRecords.erase(found);
+        m_records.erase(found);
     }
     item->discard();
     return record;
@@ -83,10 +83,10 @@ std::unique_ptr<Archive> ArchiveItems::take(ArchiveItem* item)
 // that is being delivered.
 void ArchiveItems::clear()
 {
-    mPictures.reset();
-    mIncomplete.clear();
-    for (ArchiveItem* item : std::as_const(mItems))
+    m_pictures.reset();
+    m_incomplete.clear();
+    for (ArchiveItem* item : std::as_const(m_items))
         item->discard();
-    mItems.clear();
-    mRecords.clear();
+    m_items.clear();
+    m_records.clear();
 }

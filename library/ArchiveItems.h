@@ -26,7 +26,7 @@ public:
     // Keeps the record until its item is taken or all items are cleared.
     Archive* own(std::unique_ptr<Archive> record);
 
-    const QList<ArchiveItem*>& all() const { return mItems; }
+    const QList<ArchiveItem*>& all() const { return m_items; }
     // Returns the item of the title file, or null.
     ArchiveItem* find(const QString& path) const;
 
@@ -35,7 +35,7 @@ public:
     // Creates the child widgets of the item. Does nothing for an item that was taken or is complete.
     void complete(ArchiveItem* item);
     // Returns whether all items returned by beginToComplete() are complete.
-    bool isComplete() const { return mIncomplete.isEmpty(); }
+    bool isComplete() const { return m_incomplete.isEmpty(); }
 
     // Discards the item and returns its record; null if that is not owned here.
     std::unique_ptr<Archive> take(ArchiveItem* item);
@@ -43,9 +43,9 @@ public:
     void clear();
 
 private:
-    QWidget* mList;
-    std::vector<std::unique_ptr<Archive>> mRecords;
-    QList<ArchiveItem*> mItems;
-    QList<ArchiveItem*> mIncomplete;
-    std::unique_ptr<SmallPictures> mPictures; // pictures of mIncomplete, in the same order
+    QWidget* m_list;
+    std::vector<std::unique_ptr<Archive>> m_records;
+    QList<ArchiveItem*> m_items;
+    QList<ArchiveItem*> m_incomplete;
+    std::unique_ptr<SmallPictures> m_pictures; // pictures of m_incomplete, in the same order
 };

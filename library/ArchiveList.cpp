@@ -56,27 +56,27 @@ void sweepTitleFolders()
 
 ArchiveList::ArchiveList(QLabel* folderLabel, bool autoInit, QWidget* parent)
     : KSScrollViewerWidget(parent)
-    , mController(std::make_unique<ArchiveController>())
-    , mItems(this)
-    , mActions(std::make_unique<TitleMenuActions>(this, *mController))
-    , mFolderLabel(folderLabel)
+    , m_controller(std::make_unique<ArchiveController>())
+    , m_items(this)
+    , m_actions(std::make_unique<TitleMenuActions>(this, *m_controller))
+    , m_folderLabel(folderLabel)
 {
     setMenuFont(QStringLiteral("KST"));
     setScrollBarAutoShow(true);
     setItemsDragFlagAlignment(DRAGFLAG_RIGHT);
     setHEffectiveArea(EFFECTIVE_LEFT, ArchiveItem::WIDGET_WIDTH);
-    if (mFolderLabel) {
-        QFont font = mFolderLabel->font();
+    if (m_folderLabel) {
+        QFont font = m_folderLabel->font();
         font.setPointSize(LABEL_FONT_SIZE);
-        mFolderLabel->setFont(font);
-        mFolderLabel->setTextFormat(Qt::PlainText);
-        mFolderLabel->setText(tr("Folder"));
+        m_folderLabel->setFont(font);
+        m_folderLabel->setTextFormat(Qt::PlainText);
+        m_folderLabel->setText(tr("Folder"));
     }
     initArchiveListConnect();
     connectMenuActions();
     SaveOutage::instance(); // the order may be saved from now on
     sweepTitleFolders();
-    mController->reCreateOrderXml();
+    m_controller->reCreateOrderXml();
     if (autoInit)
         initArchiveList();
 }
@@ -89,7 +89,7 @@ ArchiveList::~ArchiveList()
 
 void ArchiveList::initArchiveListConnect()
 {
-    connect(this, &KSScrollViewerWidget::widgetItemPressed, this, [this] { mLongHold = false; });
+    connect(this, &KSScrollViewerWidget::widgetItemPressed, this, [this] { m_longHold = false; });
     connect(this, &KSScrollViewerWidget::widgetItemReleased, this, &ArchiveList::itemReleasedEvent);
     connect(this, &KSScrollViewerWidget::widgetItemLongHold, this, &ArchiveList::itemLongHoldEvent);
     connect(this, &KSScrollViewerWidget::widgetItemPressedAndHold, this,
@@ -101,10 +101,10 @@ void ArchiveList::initArchiveListConnect()
     connect(this, &ArchiveList::signalStartMove, this, &KSScrollViewerWidget::slotStartDrag);
     connect(this, &ArchiveList::signalItemsCanDrag, this, &KSScrollViewerWidget::slotItemsCanDrag);
     connect(this, &KSScrollViewerWidget::signalVisibleItemsChange, this, [this] {
-        if (mItems.all().size() > MOST_ITEMS && !std::exchange(mGiveBackRequested, true))
+        if (m_items.all().size() > MOST_ITEMS && !std::exchange(m_giveBackRequested, true))
             QMetaObject::invokeMethod(this, &ArchiveList::giveBackItems, Qt::QueuedConnection);
     });
-    connect(&mRows, &TitleRows::unreadableFound, this, &ArchiveList::removeUnreadable);
+    connect(&m_rows, &TitleRows::unreadableFound, this, &ArchiveList::removeUnreadable);
     connect(this, &ArchiveList::signalAddArchiveData, this, &ArchiveList::slotAddArchiveData,
             Qt::QueuedConnection);
     connect(this, &ArchiveList::signalAddOneArchiveData, this, &ArchiveList::slotAddOneArchiveData,
@@ -113,66 +113,66 @@ void ArchiveList::initArchiveListConnect()
 
 void ArchiveList::connectMenuActions()
 {
-    connect(mActions.get(), &TitleMenuActions::deleteCommandSignal, this, &ArchiveList::deleteCommandSignal);
-    connect(mActions.get(), &TitleMenuActions::pasteCommandSignal, this, &ArchiveList::pasteCommandSignal);
-    connect(mActions.get(), &TitleMenuActions::addUserSignal, this, &ArchiveList::addUserSignal);
-    connect(mActions.get(), &TitleMenuActions::startTemplatePicker, this, &ArchiveList::startTemplatePicker);
-    connect(mActions.get(), &TitleMenuActions::startUserTemplatePicker, this,
+    connect(m_actions.get(), &TitleMenuActions::deleteCommandSignal, this, &ArchiveList::deleteCommandSignal);
+    connect(m_actions.get(), &TitleMenuActions::pasteCommandSignal, this, &ArchiveList::pasteCommandSignal);
+    connect(m_actions.get(), &TitleMenuActions::addUserSignal, this, &ArchiveList::addUserSignal);
+    connect(m_actions.get(), &TitleMenuActions::startTemplatePicker, this, &ArchiveList::startTemplatePicker);
+    connect(m_actions.get(), &TitleMenuActions::startUserTemplatePicker, this,
             &ArchiveList::startUserTemplatePicker);
-    connect(mActions.get(), &TitleMenuActions::archiveListMenuShow, this, &ArchiveList::archiveListMenuShow);
-    connect(mActions.get(), &TitleMenuActions::signalStartPasteArchive, this,
+    connect(m_actions.get(), &TitleMenuActions::archiveListMenuShow, this, &ArchiveList::archiveListMenuShow);
+    connect(m_actions.get(), &TitleMenuActions::signalStartPasteArchive, this,
             &ArchiveList::signalStartPasteArchive);
-    connect(mActions.get(), &TitleMenuActions::menuAboutToClose, this, &ArchiveList::slotMenuAboutToClose);
+    connect(m_actions.get(), &TitleMenuActions::menuAboutToClose, this, &ArchiveList::slotMenuAboutToClose);
 }
 
 void ArchiveList::initArchiveList()
 {
-    const QString last = mController->getLastFolderPath();
-    const auto folders = mController->getFolderList();
+    const QString last = m_controller->getLastFolderPath();
+    const auto folders = m_controller->getFolderList();
     if (!last.isEmpty() && QDir(last).exists() &&
         ConfinedPath::isBelow(&IPathManagerEx::getTitleResourcesPath, last.toStdString()))
-        mCurrentPath = last;
+        m_currentPath = last;
     else if (!folders.isEmpty())
-        mCurrentPath = QString::fromStdString(folders.front());
+        m_currentPath = QString::fromStdString(folders.front());
 
     ITitlerFolderReporter* reporter = ITitlerFolderReporter::instance();
-    if (reporter && !mCurrentPath.isEmpty())
-        reporter->editFolderStartStatus(mCurrentPath);
+    if (reporter && !m_currentPath.isEmpty())
+        reporter->editFolderStartStatus(m_currentPath);
     LOG_DEBUG_OPERATE(L"ArchiveList", 200,
-                      L"ArchiveList_initArchiveList() Path:" + mCurrentPath.toStdWString());
+                      L"ArchiveList_initArchiveList() Path:" + m_currentPath.toStdWString());
     initArchiveListData();
 }
 
 void ArchiveList::initArchiveListData()
 {
-    if (mCurrentPath.isEmpty())
+    if (m_currentPath.isEmpty())
         return;
     setFolderLabel();
     endInitThread();
     prepareOrder();
-    mInitThread = std::make_unique<ArchiveInitThread>(mCurrentPath);
-    connect(mInitThread.get(), &ArchiveInitThread::threadGetArchiveListFinished, this,
+    m_initThread = std::make_unique<ArchiveInitThread>(m_currentPath);
+    connect(m_initThread.get(), &ArchiveInitThread::threadGetArchiveListFinished, this,
             &ArchiveList::getArchiveListSuccessed, Qt::BlockingQueuedConnection);
-    mInitThread->start(QThread::InheritPriority);
+    m_initThread->start(QThread::InheritPriority);
 }
 
 // Ends the loader. It may be blocked until this thread has taken its titles, so these are accepted and
 // dropped.
 void ArchiveList::endInitThread()
 {
-    if (!mInitThread)
+    if (!m_initThread)
         return;
-    mInitThread->cancel();
-    mIgnoreLoaded = true;
-    while (!mInitThread->wait(LOADER_POLL))
+    m_initThread->cancel();
+    m_ignoreLoaded = true;
+    while (!m_initThread->wait(LOADER_POLL))
         QCoreApplication::sendPostedEvents(this, QEvent::MetaCall);
-    mIgnoreLoaded = false;
-    mInitThread.reset();
+    m_ignoreLoaded = false;
+    m_initThread.reset();
 }
 
 void ArchiveList::getArchiveListSuccessed(QList<Archive*> archivesList)
 {
-    if (mIgnoreLoaded) {
+    if (m_ignoreLoaded) {
         qDeleteAll(archivesList);
         return;
     }
@@ -199,25 +199,25 @@ void ArchiveList::initArchiveListRefreshData()
 {
     setFolderLabel();
     prepareOrder();
-    addRows(mRows.read(*this, mCurrentPath), -1);
+    addRows(m_rows.read(*this, m_currentPath), -1);
     if (ITitlerFolderReporter* reporter = ITitlerFolderReporter::instance())
-        reporter->editFolderStartStatus(mCurrentPath);
+        reporter->editFolderStartStatus(m_currentPath);
 }
 
 void ArchiveList::finishCheck()
 {
-    if (!mRows.isChecking())
+    if (!m_rows.isChecking())
         return;
-    mRows.waitForCheck();
+    m_rows.waitForCheck();
     removeUnreadable();
-    mRows.endCheck();
+    m_rows.endCheck();
 }
 
 // Removes the rows of unreadable titles. A row with an item was read successfully before and stays unless its
 // own read failed.
 void ArchiveList::removeUnreadable()
 {
-    const QSet<std::size_t> found = mRows.takeUnreadable();
+    const QSet<std::size_t> found = m_rows.takeUnreadable();
     QList<int> gone;
     QList<ArchiveItem*> items;
     for (int i = 0; i < count(); ++i) {
@@ -231,12 +231,12 @@ void ArchiveList::removeUnreadable()
     }
     if (gone.isEmpty())
         return;
-    mActions->rowsRemoved(gone);
-    mMoveSource -=
-        static_cast<int>(std::lower_bound(gone.cbegin(), gone.cend(), mMoveSource) - gone.cbegin());
+    m_actions->rowsRemoved(gone);
+    m_moveSource -=
+        static_cast<int>(std::lower_bound(gone.cbegin(), gone.cend(), m_moveSource) - gone.cbegin());
     removeRows(gone);
     for (ArchiveItem* item : std::as_const(items))
-        mItems.take(item);
+        m_items.take(item);
 }
 
 ArchiveRow* ArchiveList::archiveRow(int index) const
@@ -285,7 +285,7 @@ int ArchiveList::findTitle(const QString& path) const
 
 ArchiveItem* ArchiveList::findItem(const QString& path) const
 {
-    ArchiveItem* item = mItems.find(path);
+    ArchiveItem* item = m_items.find(path);
     return item ? item : archiveItem(findTitle(path));
 }
 
@@ -297,42 +297,42 @@ ArchiveItem* ArchiveList::makeItem(ArchiveRow& row)
         record = std::make_unique<Archive>();
         QMetaObject::invokeMethod(this, &ArchiveList::removeUnreadable, Qt::QueuedConnection);
     }
-    ArchiveItem* item = createBaseItem(mItems.own(std::move(record)));
+    ArchiveItem* item = createBaseItem(m_items.own(std::move(record)));
     requestContents();
     return item;
 }
 
 void ArchiveList::requestContents()
 {
-    if (!std::exchange(mContentsRequested, true))
+    if (!std::exchange(m_contentsRequested, true))
         Q_EMIT signalAddArchiveData();
 }
 
 void ArchiveList::slotAddArchiveData()
 {
-    mContentsRequested = false;
-    for (ArchiveItem* item : mItems.beginToComplete())
+    m_contentsRequested = false;
+    for (ArchiveItem* item : m_items.beginToComplete())
         Q_EMIT signalAddOneArchiveData(item);
     beginCheck();
 }
 
 void ArchiveList::slotAddOneArchiveData(ArchiveItem* item)
 {
-    mItems.complete(item);
+    m_items.complete(item);
     beginCheck();
 }
 
 // Starts the check once the items on screen are complete.
 void ArchiveList::beginCheck()
 {
-    if (mItems.isComplete())
-        mRows.beginCheck();
+    if (m_items.isComplete())
+        m_rows.beginCheck();
 }
 
 // Gives back the items farthest from the view. Called after a long folder was scrolled.
 void ArchiveList::giveBackItems()
 {
-    mGiveBackRequested = false;
+    m_giveBackRequested = false;
     std::vector<std::pair<int, ArchiveItem*>> made; // sorted by distance from the view
     for (int i = 0; i < count(); ++i)
         if (ArchiveItem* item = madeItem(i))
@@ -341,22 +341,22 @@ void ArchiveList::giveBackItems()
     for (; static_cast<qsizetype>(made.size()) > ITEMS_KEPT; made.pop_back()) {
         ArchiveItem* item = made.back().second;
         const bool isNeeded = item == getSelectedArchive() || item == getCurrentOperationArchive() ||
-                              item == mDraggedItem || item->isHeld();
+                              item == m_draggedItem || item->isHeld();
         ArchiveRow* row = archiveRow(getItemIndex(item));
         if (!isNeeded && giveBackWidgetItem(item))
-            row->putBack(mItems.take(item));
+            row->putBack(m_items.take(item));
     }
 }
 
 void ArchiveList::prepareOrder()
 {
-    mCleanUp = mController->prepareOrder(mCurrentPath) ? CleanUp::Allowed : CleanUp::Withheld;
+    m_cleanUp = m_controller->prepareOrder(m_currentPath) ? CleanUp::Allowed : CleanUp::Withheld;
 }
 
 void ArchiveList::setFolderLabel()
 {
-    if (mFolderLabel)
-        mFolderLabel->setText(mCurrentPath.section(QLatin1Char('/'), -1, -1, QString::SectionSkipEmpty));
+    if (m_folderLabel)
+        m_folderLabel->setText(m_currentPath.section(QLatin1Char('/'), -1, -1, QString::SectionSkipEmpty));
 }
 
 ArchiveItem* ArchiveList::archiveItem(int index) const
@@ -378,7 +378,7 @@ void ArchiveList::selectArchive(int index)
         setSelectItemState(item);
         saveLastArchivePathAndNotifyCanvasUpdate(item);
     } else {
-        mSelection.forgetSelected();
+        m_selection.forgetSelected();
         Q_EMIT signalUpdateCanvas(nullptr);
     }
 }
@@ -396,7 +396,7 @@ void ArchiveList::setSelectItemState(ArchiveItem* item)
 {
     if (!item)
         return;
-    mSelection.select(item);
+    m_selection.select(item);
     LOG_USER_OPERATE(L"Thumbnail", 200,
                      L"Select  the " + std::to_wstring(getItemIndex(item)) + L" Thumbnail");
     moveCurrentArchiveItemVisble();
@@ -414,15 +414,15 @@ void ArchiveList::setDefaultItemState(ArchiveItem* item)
 void ArchiveList::clearOldFlagState()
 {
     clearOperationItemState(getCurrentOperationArchive());
-    mSelection.forgetOperation();
-    mLongHold = false;
+    m_selection.forgetOperation();
+    m_longHold = false;
 }
 
 void ArchiveList::saveLastArchivePathAndNotifyCanvasUpdate(ArchiveItem* item)
 {
     if (!item)
         return;
-    mController->setLastArchivePath(item->getArchiveDataPath());
+    m_controller->setLastArchivePath(item->getArchiveDataPath());
     Q_EMIT signalUpdateCanvas(item->getArchiveData());
 }
 
@@ -442,10 +442,10 @@ void ArchiveList::moveCurrentArchiveItemVisble()
 void ArchiveList::itemReleasedEvent(KSBaseItemWidget* released, QPoint, KSScrollViewerWidget*)
 {
     auto* item = qobject_cast<ArchiveItem*>(released);
-    if (mMoveMode)
+    if (m_moveMode)
         return;
     ArchiveItem* old = getSelectedArchive();
-    if (item && !mLongHold) {
+    if (item && !m_longHold) {
         if (item != old) {
             setSelectItemState(item);
             setDefaultItemState(old);
@@ -455,7 +455,7 @@ void ArchiveList::itemReleasedEvent(KSBaseItemWidget* released, QPoint, KSScroll
             setSelectItemState(item);
         }
     }
-    mLongHold = false;
+    m_longHold = false;
 }
 
 QList<ArchiveOrder*> ArchiveList::getArchiveOrderList() const
@@ -473,11 +473,11 @@ QList<ArchiveOrder*> ArchiveList::getArchiveOrderList() const
 void ArchiveList::saveArchiveListOrder()
 {
     std::unordered_set<std::string> known;
-    for (const ArchiveItem* item : mItems.all()) // includes items that only undo commands hold
+    for (const ArchiveItem* item : m_items.all()) // includes items that only undo commands hold
         known.insert(QFileInfo(item->getArchiveDataPath()).fileName().toStdString());
     const QList<ArchiveOrder*> orders = getArchiveOrderList();
-    if (!mController->saveListedOrder(mCurrentPath, orders, known))
-        mCleanUp = CleanUp::Withheld;
+    if (!m_controller->saveListedOrder(m_currentPath, orders, known))
+        m_cleanUp = CleanUp::Withheld;
     qDeleteAll(orders);
 }
 
@@ -488,26 +488,26 @@ void ArchiveList::refreshBaseItem(QString archiveFilePath, QImage leftImage)
     if (!item)
         return;
     Archive archive;
-    if (mController->getOneArchive(archiveFilePath, &archive))
+    if (m_controller->getOneArchive(archiveFilePath, &archive))
         item->updateArchiveData(&archive);
     item->updateContents(leftImage);
 }
 
 void ArchiveList::clearOldArchiveList()
 {
-    mRows.endCheck();
+    m_rows.endCheck();
     removeAll();
-    mItems.clear();
+    m_items.clear();
 }
 
 void ArchiveList::resetPositions()
 {
-    mSelection = TitleSelection();
-    mActions->setOperationPosition(-1);
-    mDraggedItem.clear();
-    mMoveSource = -1;
-    mMoving = false;
-    mLongHold = false;
+    m_selection = TitleSelection();
+    m_actions->setOperationPosition(-1);
+    m_draggedItem.clear();
+    m_moveSource = -1;
+    m_moving = false;
+    m_longHold = false;
 }
 
 void ArchiveList::cleanArchiveList()
@@ -515,26 +515,26 @@ void ArchiveList::cleanArchiveList()
     endInitThread();
     clearOldArchiveList();
     resetPositions();
-    mCurrentPath.clear();
-    if (mFolderLabel)
-        mFolderLabel->clear();
+    m_currentPath.clear();
+    if (m_folderLabel)
+        m_folderLabel->clear();
 }
 
 void ArchiveList::synchronizationFolderFile()
 {
-    if (mCurrentPath.isEmpty())
+    if (m_currentPath.isEmpty())
         return;
     if (!isEmpty() && orderIsDamaged())
         saveArchiveListOrder();
-    if (mCleanUp == CleanUp::Allowed)
-        mController->deleteUnusefulArchives(mCurrentPath);
+    if (m_cleanUp == CleanUp::Allowed)
+        m_controller->deleteUnusefulArchives(m_currentPath);
 }
 
 // Returns whether the order file does not match the list: its last write was refused, or another program has
 // damaged it.
 bool ArchiveList::orderIsDamaged() const
 {
-    const std::string folder = mCurrentPath.toStdString();
+    const std::string folder = m_currentPath.toStdString();
     std::vector<ArchiveOrder> rows;
     return FolderOrder::isKept(folder) || FolderOrder::read(folder, rows) != FolderOrder::State::Whole ||
            rows.empty();
@@ -545,14 +545,14 @@ bool ArchiveList::orderIsDamaged() const
 void ArchiveList::openFolder(const QString& path)
 {
     endInitThread();
-    mController->setLastFolderPath(path);
+    m_controller->setLastFolderPath(path);
     setDefaultItemState(getSelectedArchive());
     clearOperationItemState(getCurrentOperationArchive());
     // Each start notice needs an end notice, otherwise the old folder stays locked for the sibling processes.
     ITitlerFolderReporter* reporter = ITitlerFolderReporter::instance();
-    if (reporter && !mCurrentPath.isEmpty())
-        reporter->editFolderEndStatus(mCurrentPath);
-    mCurrentPath = path;
+    if (reporter && !m_currentPath.isEmpty())
+        reporter->editFolderEndStatus(m_currentPath);
+    m_currentPath = path;
     clearOldArchiveList();
     resetPositions();
     initArchiveListRefreshData();
@@ -619,16 +619,16 @@ void ArchiveList::refreshArchiveListForChangeFolderName(QString before, QString 
     LOG_DEBUG_OPERATE(L"ArchiveList", 200,
                       L"ArchiveList_refreshArchiveListForChangeFolderName() Enter Before:" +
                           before.toStdWString() + L" After:" + after.toStdWString());
-    if (QDir::cleanPath(before) != QDir::cleanPath(mCurrentPath)) // the path in a request may end with a "/"
+    if (QDir::cleanPath(before) != QDir::cleanPath(m_currentPath)) // the path in a request may end with a "/"
         return;
     endInitThread();
-    mController->setLastFolderPath(after);
-    if (mMainScene)
-        mMainScene->folderRenamed(before, after);
+    m_controller->setLastFolderPath(after);
+    if (m_mainScene)
+        m_mainScene->folderRenamed(before, after);
     const int selected = getItemIndex(getSelectedArchive());
     const QString fileName = QFileInfo(titlePath(selected)).fileName();
     setDefaultItemState(getSelectedArchive());
-    mCurrentPath = after;
+    m_currentPath = after;
     clearOldArchiveList();
     resetPositions();
     initArchiveListRefreshData();
@@ -645,35 +645,35 @@ void ArchiveList::refreshArchiveListForChangeFolderName(QString before, QString 
 
 bool ArchiveList::checkArchiveListIsFull()
 {
-    if (mRows.readAtOnce() < ListMessages::TITLE_LIMIT)
+    if (m_rows.readAtOnce() < ListMessages::TITLE_LIMIT)
         finishCheck();
     return count() > ListMessages::TITLE_LIMIT - 1;
 }
 
 bool ArchiveList::checkDiskSpaceIsFull() const
 {
-    return SystemInfo::getInstance()->getDiskRemainSize(mCurrentPath.toStdWString()) <
+    return SystemInfo::getInstance()->getDiskRemainSize(m_currentPath.toStdWString()) <
            LIMIT_REMAIN * KB_MILLION;
 }
 
 void ArchiveList::itemLongHoldEvent(KSBaseItemWidget* item, QPoint pos, KSScrollViewerWidget* scrollArea)
 {
-    if (mMoveMode)
+    if (m_moveMode)
         return;
-    mLongHold = true;
-    mActions->showOptionMenu(qobject_cast<ArchiveItem*>(item), pos, scrollArea);
+    m_longHold = true;
+    m_actions->showOptionMenu(qobject_cast<ArchiveItem*>(item), pos, scrollArea);
     setFlickAbility(false);
 }
 
 void ArchiveList::itemRightPressedEvent(KSBaseItemWidget* item, QPoint pos, KSScrollViewerWidget* scrollArea)
 {
-    if (!mMoveMode)
-        mActions->showOptionMenu(qobject_cast<ArchiveItem*>(item), pos, scrollArea);
+    if (!m_moveMode)
+        m_actions->showOptionMenu(qobject_cast<ArchiveItem*>(item), pos, scrollArea);
 }
 
 void ArchiveList::slotMenuAboutToClose()
 {
-    mActions->sendTitlerAppEvent(false);
+    m_actions->sendTitlerAppEvent(false);
     clearOperationItemState(getCurrentOperationArchive());
 }
 
@@ -688,8 +688,8 @@ void ArchiveList::wheelEvent(QWheelEvent* event)
 void ArchiveList::waitForCanvas()
 {
     setDefaultItemState(getSelectedArchive());
-    if (mMainScene)
-        mMainScene->waitForPictures();
+    if (m_mainScene)
+        m_mainScene->waitForPictures();
     TitleSelection::showSelected(getSelectedArchive());
 }
 
@@ -697,30 +697,30 @@ void ArchiveList::setMenuFont(const QString& family)
 {
     QFont font(family);
     font.setPixelSize(MENU_FONT_SIZE);
-    mActions->setMenuFont(font);
+    m_actions->setMenuFont(font);
 }
 
 void ArchiveList::setSystemLanFont(QString family)
 {
     setMenuFont(family);
     ArchiveItem::setSystemFontFamily(family);
-    for (ArchiveItem* item : mItems.all()) // includes items that are not listed and may return
+    for (ArchiveItem* item : m_items.all()) // includes items that are not listed and may return
         item->updateRightChild();
 }
 
 void ArchiveList::translateText()
 {
-    mActions->translateText();
+    m_actions->translateText();
     // The label of a closed folder stays empty.
-    if (mFolderLabel && mCurrentPath.isEmpty() && !mFolderLabel->text().isEmpty())
-        mFolderLabel->setText(tr("Folder"));
+    if (m_folderLabel && m_currentPath.isEmpty() && !m_folderLabel->text().isEmpty())
+        m_folderLabel->setText(tr("Folder"));
 }
 
 // --- Move mode: titles are dragged by their handles to another place ------------------------------------
 
 void ArchiveList::moveButtonClicked(bool isMoveMode)
 {
-    mMoveMode = isMoveMode;
+    m_moveMode = isMoveMode;
     if (isMoveMode)
         finishCheck();
     Q_EMIT signalItemsCanDrag(isMoveMode);
@@ -731,7 +731,7 @@ void ArchiveList::moveButtonClicked(bool isMoveMode)
 void ArchiveList::itemPressedAndHoldEvent(KSBaseItemWidget* item, QPoint pos, KSScrollViewerWidget*,
                                           bool& willMenuPopup)
 {
-    if (mMoveMode || !item)
+    if (m_moveMode || !item)
         return;
     const QWidget* right = item->getRightChild();
     willMenuPopup = right && right->geometry().contains(pos);
@@ -746,26 +746,26 @@ void ArchiveList::itemFlickEvent(KSBaseItemWidget* item, QPoint, KSScrollViewerW
 
 void ArchiveList::slotDragOneItem(KSBaseItemWidget* item, int index, KSScrollViewerWidget*)
 {
-    mDraggedItem = qobject_cast<ArchiveItem*>(item);
+    m_draggedItem = qobject_cast<ArchiveItem*>(item);
     clearOperationItemState(getCurrentOperationArchive());
-    setOperationItemState(mDraggedItem);
-    mMoveSource = index;
-    mMoving = true;
+    setOperationItemState(m_draggedItem);
+    m_moveSource = index;
+    m_moving = true;
 }
 
 void ArchiveList::slotItemDrop()
 {
-    mMoving = false;
+    m_moving = false;
     saveArchiveListOrder();
     if (ITitlerFolderReporter* reporter = ITitlerFolderReporter::instance())
-        reporter->updateTitlerOrder(mCurrentPath);
-    ArchiveItem* item = mDraggedItem;
+        reporter->updateTitlerOrder(m_currentPath);
+    ArchiveItem* item = m_draggedItem;
     const int position = getItemIndex(item);
     if (position < 0)
         return;
-    mActions->setOperationPosition(position);
+    m_actions->setOperationPosition(position);
     setOperationItemState(item);
-    if (mMoveSource != position)
-        Q_EMIT moveCommandSignal(new MoveArchiveCommand(this, item, mMoveSource, position, nullptr));
-    mDraggedItem.clear();
+    if (m_moveSource != position)
+        Q_EMIT moveCommandSignal(new MoveArchiveCommand(this, item, m_moveSource, position, nullptr));
+    m_draggedItem.clear();
 }

@@ -45,10 +45,10 @@ public:
     ArchiveList(QLabel* folderLabel, bool autoInit, QWidget* parent = nullptr);
     ~ArchiveList() override;
 
-    QString getCurrentPath() const { return mCurrentPath; }
-    ArchiveItem* getCurrentOperationArchive() const { return mSelection.operation(); }
-    ArchiveItem* getSelectedArchive() const { return mSelection.selected(); }
-    bool IsOptionMenuShowing() const { return mActions->isMenuShowing(); }
+    QString getCurrentPath() const { return m_currentPath; }
+    ArchiveItem* getCurrentOperationArchive() const { return m_selection.operation(); }
+    ArchiveItem* getSelectedArchive() const { return m_selection.selected(); }
+    bool IsOptionMenuShowing() const { return m_actions->isMenuShowing(); }
     int getItemIndex(ArchiveItem* item) const;
     // Returns the item, or null for an index out of range. Items are made when they scroll into view or when
     // they are requested here, and may be given back when a long folder is scrolled on; use HeldArchiveItem
@@ -56,9 +56,9 @@ public:
     ArchiveItem* archiveItem(int index) const;
     // Returns the full path of the title file without making an item. Empty for an index out of range.
     QString titlePath(int index) const;
-    bool isMoveMode() const { return mMoveMode; }
+    bool isMoveMode() const { return m_moveMode; }
     // Returns whether an item is being dragged.
-    bool getMoveState() const { return mMoving; }
+    bool getMoveState() const { return m_moving; }
 
     // Opens the last folder used, or otherwise the first one; a thread loads its titles.
     void initArchiveList();
@@ -69,15 +69,15 @@ public:
     void selectOperationArchive(int index);
     void setSelectItemState(ArchiveItem* item);
     void setDefaultItemState(ArchiveItem* item);
-    void setOperationItemState(ArchiveItem* item) { mSelection.mark(item); }
-    void clearOperationItemState(ArchiveItem* item) { mSelection.removeBorder(item); }
+    void setOperationItemState(ArchiveItem* item) { m_selection.mark(item); }
+    void clearOperationItemState(ArchiveItem* item) { m_selection.removeBorder(item); }
     void clearOldFlagState();
     // Stores the title as the last one used and sends it to the canvas.
     void saveLastArchivePathAndNotifyCanvasUpdate(ArchiveItem* item);
 
     // Empties the list, the path and the label.
     void cleanArchiveList();
-    void clearCopyArchive() { mActions->clearCopyArchive(); }
+    void clearCopyArchive() { m_actions->clearCopyArchive(); }
     // Saves the order again if its file is damaged. Removes the files of titles that are no longer in the
     // list, unless the order could not be read when the folder was opened, or not be written since.
     void synchronizationFolderFile();
@@ -86,7 +86,7 @@ public:
     void translateText();
 
     // Makes an item without child widgets, which are created when it is on screen. The list is its parent.
-    ArchiveItem* createBaseItem(Archive* archive) { return mItems.make(archive); }
+    ArchiveItem* createBaseItem(Archive* archive) { return m_items.make(archive); }
     // Returns the given item or, for null, a new one of the record, complete with child widgets.
     ArchiveItem* createPasteUndoItem(Archive* archive, ArchiveItem* item);
 
@@ -109,7 +109,7 @@ public:
     // the rows.
     void finishCheck();
     // Keeps the record for an item that is about to be made.
-    Archive* own(std::unique_ptr<Archive> record) { return mItems.own(std::move(record)); }
+    Archive* own(std::unique_ptr<Archive> record) { return m_items.own(std::move(record)); }
     // Blocks until the pictures of the selected title are written.
     void waitForCanvas();
 
@@ -136,7 +136,7 @@ Q_SIGNALS:
     void signalStartPasteArchive();
 
 public Q_SLOTS:
-    void slotHideOptionMenu() { mActions->hideMenu(); }
+    void slotHideOptionMenu() { m_actions->hideMenu(); }
     void slotMenuAboutToClose();
     void slotDragOneItem(KSBaseItemWidget* item, int index, KSScrollViewerWidget* scrollArea);
     void slotItemDrop();
@@ -152,9 +152,9 @@ public Q_SLOTS:
     void itemRightPressedEvent(KSBaseItemWidget* item, QPoint pos, KSScrollViewerWidget* scrollArea);
     void itemFlickEvent(KSBaseItemWidget* item, QPoint pos, KSScrollViewerWidget* scrollArea,
                         bool& willFlick);
-    void selectOptionMenuItem(QAction* action) { mActions->selectOptionMenuItem(action); }
+    void selectOptionMenuItem(QAction* action) { m_actions->selectOptionMenuItem(action); }
     // Makes a title from the template's record, after the operation item.
-    void createArchiveFromTemplate(Archive* temp) { mActions->createArchiveFromTemplate(temp); }
+    void createArchiveFromTemplate(Archive* temp) { m_actions->createArchiveFromTemplate(temp); }
     void refreshArchiveList(QString path);
     void refreshArchiveListForChangeFolderName(QString before, QString after);
     void refreshArchiveListInFile(QString path, QString fileName);
@@ -162,7 +162,7 @@ public Q_SLOTS:
     void getArchiveListSuccessed(QList<Archive*> archivesList);
     void moveCurrentArchiveItemVisble();
     // Sets the canvas, which is not owned.
-    void setMainScene(CanvasScene* mainScene) { mMainScene = mainScene; }
+    void setMainScene(CanvasScene* mainScene) { m_mainScene = mainScene; }
     void wheelEvent(QWheelEvent* event) override;
 
 private:
@@ -191,25 +191,25 @@ private:
     void offerTemplateOrReportFull();
     ArchiveItem* findItem(const QString& path) const;
 
-    std::unique_ptr<ArchiveController> mController;
-    std::unique_ptr<ArchiveInitThread> mInitThread;
-    bool mIgnoreLoaded = false; // set while a loader is being ended, which may still deliver titles
-    TitleRows mRows;
-    ArchiveItems mItems;
-    bool mContentsRequested = false;
-    bool mGiveBackRequested = false;
-    std::unique_ptr<TitleMenuActions> mActions;
-    QLabel* mFolderLabel;
-    CanvasScene* mMainScene = nullptr;
+    std::unique_ptr<ArchiveController> m_controller;
+    std::unique_ptr<ArchiveInitThread> m_initThread;
+    bool m_ignoreLoaded = false; // set while a loader is being ended, which may still deliver titles
+    TitleRows m_rows;
+    ArchiveItems m_items;
+    bool m_contentsRequested = false;
+    bool m_giveBackRequested = false;
+    std::unique_ptr<TitleMenuActions> m_actions;
+    QLabel* m_folderLabel;
+    CanvasScene* m_mainScene = nullptr;
     // Whether unlisted title files of the folder may be removed. Withheld when the order could not be read or
     // written, until the folder is opened again.
     enum class CleanUp { Allowed, Withheld };
-    CleanUp mCleanUp = CleanUp::Withheld;
-    QString mCurrentPath;
-    TitleSelection mSelection;
-    QPointer<ArchiveItem> mDraggedItem;
-    int mMoveSource = -1;   // row of the dragged item
-    bool mMoveMode = false; // whether titles can be dragged
-    bool mMoving = false;
-    bool mLongHold = false; // set by a long press: the release that follows must not select
+    CleanUp m_cleanUp = CleanUp::Withheld;
+    QString m_currentPath;
+    TitleSelection m_selection;
+    QPointer<ArchiveItem> m_draggedItem;
+    int m_moveSource = -1;   // row of the dragged item
+    bool m_moveMode = false; // whether titles can be dragged
+    bool m_moving = false;
+    bool m_longHold = false; // set by a long press: the release that follows must not select
 };

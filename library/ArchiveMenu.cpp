@@ -6,7 +6,7 @@ ArchiveMenu::ArchiveMenu(QWidget* parent) : KSMenu(parent)
          {ArchiveAction::ACTION_CREATE, ArchiveAction::ACTION_COPY, ArchiveAction::ACTION_PASTE,
           ArchiveAction::ACTION_DELETE, ArchiveAction::ACTION_ADD_USER}) {
         auto* entry = new ArchiveAction(QString(), type, this);
-        mActions.append(entry);
+        m_actions.append(entry);
         addAction(entry);
     }
     translateText();
@@ -32,7 +32,7 @@ void ArchiveMenu::enableFor(bool onItem, bool hasCopy)
 
 ArchiveAction* ArchiveMenu::action(ArchiveAction::ARCHIVE_ACTION_TYPE type) const
 {
-    for (ArchiveAction* entry : mActions)
+    for (ArchiveAction* entry : m_actions)
         if (entry->getActionType() == type)
             return entry;
     return nullptr;

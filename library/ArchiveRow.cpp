@@ -9,16 +9,16 @@
 
 ArchiveRow::ArchiveRow(ArchiveList& list, std::shared_ptr<const FolderTitles> titles, std::size_t number,
                        std::unique_ptr<Archive> record)
-    : mList(list)
-    , mTitles(std::move(titles))
-    , mNumber(number)
-    , mPath(mTitles->path(number))
-    , mRecord(std::move(record))
+    : m_list(list)
+    , m_titles(std::move(titles))
+    , m_number(number)
+    , m_path(m_titles->path(number))
+    , m_record(std::move(record))
 {
 }
 
 ArchiveRow::ArchiveRow(ArchiveList& list, std::unique_ptr<Archive> record)
-    : mList(list), mPath(record->getPath()), mRecord(std::move(record))
+    : m_list(list), m_path(record->getPath()), m_record(std::move(record))
 {
 }
 
@@ -31,19 +31,19 @@ QSize ArchiveRow::size() const
 
 KSBaseItemWidget* ArchiveRow::makeWidget()
 {
-    return mList.makeItem(*this);
+    return m_list.makeItem(*this);
 }
 
 std::unique_ptr<Archive> ArchiveRow::takeRecord()
 {
-    if (!mRecord && mTitles)
-        mRecord = mTitles->read(mNumber);
-    mIsUnreadable = !mRecord;
-    return std::move(mRecord);
+    if (!m_record && m_titles)
+        m_record = m_titles->read(m_number);
+    m_isUnreadable = !m_record;
+    return std::move(m_record);
 }
 
 void ArchiveRow::putBack(std::unique_ptr<Archive> record)
 {
-    if (!mTitles)
-        mRecord = std::move(record);
+    if (!m_titles)
+        m_record = std::move(record);
 }

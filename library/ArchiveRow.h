@@ -26,9 +26,9 @@ public:
     QSize size() const override;
     KSBaseItemWidget* makeWidget() override;
 
-    std::size_t number() const { return mNumber; }
+    std::size_t number() const { return m_number; }
     // Returns the full path of the title file; empty for a blank row.
-    const std::string& path() const { return mPath; }
+    const std::string& path() const { return m_path; }
 
     // Returns the record, reading it from the file if needed. Null when the file cannot be read.
     std::unique_ptr<Archive> takeRecord();
@@ -36,13 +36,13 @@ public:
     // again.
     void putBack(std::unique_ptr<Archive> record);
     // Returns whether the last call of takeRecord() could not read the file.
-    bool isUnreadable() const { return mIsUnreadable; }
+    bool isUnreadable() const { return m_isUnreadable; }
 
 private:
-    ArchiveList& mList;
-    std::shared_ptr<const FolderTitles> mTitles;
-    std::size_t mNumber = 0;
-    std::string mPath;
-    std::unique_ptr<Archive> mRecord;
-    bool mIsUnreadable = false;
+    ArchiveList& m_list;
+    std::shared_ptr<const FolderTitles> m_titles;
+    std::size_t m_number = 0;
+    std::string m_path;
+    std::unique_ptr<Archive> m_record;
+    bool m_isUnreadable = false;
 };

@@ -7,44 +7,44 @@
 
 DeleteArchiveCommand::DeleteArchiveCommand(ArchiveList* list, ArchiveItem* item, int position,
                                            bool isSelected, QUndoCommand* parent)
-    : QUndoCommand(parent), mList(list), mItem(item), mPosition(position), mIsSelected(isSelected)
+    : QUndoCommand(parent), m_list(list), m_item(item), m_position(position), m_isSelected(isSelected)
 {
 }
 
 void DeleteArchiveCommand::redo()
 {
-    if (!ArchiveItem::isUsable(mItem))
+    if (!ArchiveItem::isUsable(m_item))
         return;
-    const QString path = mItem->getArchiveDataPath();
+    const QString path = m_item->getArchiveDataPath();
     // The selection may differ on redo, since selecting a title is not an undo step while the stack is clean.
-    mIsSelected = mIsSelected || mList->getSelectedArchive() == mItem;
-    mItem->hide();
-    mList->removeWidgetItem(mItem);
-    mList->saveArchiveListOrder();
+    m_isSelected = m_isSelected || m_list->getSelectedArchive() == m_item;
+    m_item->hide();
+    m_list->removeWidgetItem(m_item);
+    m_list->saveArchiveListOrder();
     TitleReports::titleChanged(FileManagerDefine::TITLE_DELETED, path);
     if (TitleReports::isNewInContext(path)) {
         TitleReports::removeFromContext(path);
-        mIsNewInContext = true;
+        m_isNewInContext = true;
     }
-    if (mIsSelected)
-        mList->selectArchive(qMin(mPosition, mList->count() - 1));
+    if (m_isSelected)
+        m_list->selectArchive(qMin(m_position, m_list->count() - 1));
 }
 
 void DeleteArchiveCommand::undo()
 {
-    if (!ArchiveItem::isUsable(mItem))
+    if (!ArchiveItem::isUsable(m_item))
         return;
-    const QString path = mItem->getArchiveDataPath();
-    mList->addWidgetItem(mItem, mPosition);
-    mList->saveArchiveListOrder();
-    if (mIsSelected)
-        mList->selectArchive(mPosition);
-    if (mIsNewInContext)
+    const QString path = m_item->getArchiveDataPath();
+    m_list->addWidgetItem(m_item, m_position);
+    m_list->saveArchiveListOrder();
+    if (m_isSelected)
+        m_list->selectArchive(m_position);
+    if (m_isNewInContext)
         TitleReports::addToContext(path);
     TitleReports::titleChanged(FileManagerDefine::TITLE_ADDED, path);
 }
 
 QList<ArchiveOrder*> DeleteArchiveCommand::getArchiveOrderList() const
 {
-    return mList->getArchiveOrderList();
+    return m_list->getArchiveOrderList();
 }

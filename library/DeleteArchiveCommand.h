@@ -25,9 +25,9 @@ public:
     QList<ArchiveOrder*> getArchiveOrderList() const;
 
 private:
-    ArchiveList* mList;
-    HeldArchiveItem mItem;
-    int mPosition;
-    bool mIsSelected;
-    bool mIsNewInContext = false;
+    ArchiveList* m_list;
+    HeldArchiveItem m_item;
+    int m_position;
+    bool m_isSelected;
+    bool m_isNewInContext = false;
 };

@@ -5,7 +5,7 @@
 
 FocusArchiveCommand::FocusArchiveCommand(ArchiveList* list, ArchiveItem* item, ArchiveItem* oldItem,
                                          QUndoCommand* parent)
-    : QUndoCommand(parent), mList(list), mItem(item), mOldItem(oldItem)
+    : QUndoCommand(parent), m_list(list), m_item(item), m_oldItem(oldItem)
 {
 }
 
@@ -14,30 +14,30 @@ bool FocusArchiveCommand::mergeWith(const QUndoCommand* other)
     if (other->id() != id())
         return false;
     const auto* next = static_cast<const FocusArchiveCommand*>(other);
-    if (next->mList != mList)
+    if (next->m_list != m_list)
         return false;
-    mItem = next->mItem;
+    m_item = next->m_item;
     return true;
 }
 
 void FocusArchiveCommand::redo()
 {
-    if (mSkipFirst)
-        mSkipFirst = false;
+    if (m_skipFirst)
+        m_skipFirst = false;
     else
-        changeFocus(mOldItem, mItem);
+        changeFocus(m_oldItem, m_item);
 }
 
 void FocusArchiveCommand::undo()
 {
-    changeFocus(mItem, mOldItem);
+    changeFocus(m_item, m_oldItem);
 }
 
 void FocusArchiveCommand::changeFocus(ArchiveItem* from, ArchiveItem* to)
 {
     if (from == to || !ArchiveItem::isUsable(to))
         return;
-    mList->setDefaultItemState(from);
-    mList->setSelectItemState(to);
-    mList->saveLastArchivePathAndNotifyCanvasUpdate(to);
+    m_list->setDefaultItemState(from);
+    m_list->setSelectItemState(to);
+    m_list->saveLastArchivePathAndNotifyCanvasUpdate(to);
 }

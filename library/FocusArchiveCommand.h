@@ -25,8 +25,8 @@ public:
 private:
     void changeFocus(ArchiveItem* from, ArchiveItem* to);
 
-    ArchiveList* mList;
-    HeldArchiveItem mItem;
-    HeldArchiveItem mOldItem;
-    bool mSkipFirst = true;
+    ArchiveList* m_list;
+    HeldArchiveItem m_item;
+    HeldArchiveItem m_oldItem;
+    bool m_skipFirst = true;
 };

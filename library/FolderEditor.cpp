@@ -23,7 +23,7 @@ const int TEXT_MARGIN = 6;
 } // namespace
 
 FolderEditor::FolderEditor(QWidget* parent)
-    : QLineEdit(parent), mLeft(LEFT_IMAGE), mCenter(CENTER_IMAGE), mRight(RIGHT_IMAGE)
+    : QLineEdit(parent), m_left(LEFT_IMAGE), m_center(CENTER_IMAGE), m_right(RIGHT_IMAGE)
 {
     setFocusPolicy(Qt::StrongFocus);
     setContextMenuPolicy(Qt::NoContextMenu);
@@ -39,10 +39,10 @@ FolderEditor::FolderEditor(QWidget* parent)
     const QRect text = getTextRect();
     setTextMargins(text.left(), 0, width() - text.right() - 1, 0);
 
-    connect(&mFinger, &OneFinger::acted, this,
-            [this](QEvent::Type type) { sendMouse(type, mFinger.position()); });
+    connect(&m_finger, &OneFinger::acted, this,
+            [this](QEvent::Type type) { sendMouse(type, m_finger.position()); });
     // A release outside the field ends the press without a click.
-    connect(&mFinger, &OneFinger::cancelled, this,
+    connect(&m_finger, &OneFinger::cancelled, this,
             [this] { sendMouse(QEvent::MouseButtonRelease, mapToGlobal(QPointF(-1, -1))); });
 
     auto* checker = new EditorRegExpValidator(FOLDER_PICKER_REGEXP, this);
@@ -54,7 +54,7 @@ FolderEditor::FolderEditor(QWidget* parent)
 
 QRect FolderEditor::getTextRect() const
 {
-    return rect().adjusted(qMax(TEXT_MARGIN, mLeft.width()), 0, -qMax(TEXT_MARGIN, mRight.width()), 0);
+    return rect().adjusted(qMax(TEXT_MARGIN, m_left.width()), 0, -qMax(TEXT_MARGIN, m_right.width()), 0);
 }
 
 bool FolderEditor::event(QEvent* event)
@@ -63,7 +63,7 @@ bool FolderEditor::event(QEvent* event)
         Q_EMIT signalPressedClose();
         return true;
     }
-    return mFinger.takes(event) || QLineEdit::event(event);
+    return m_finger.takes(event) || QLineEdit::event(event);
 }
 
 void FolderEditor::sendMouse(QEvent::Type type, const QPointF& globalPosition)
@@ -105,8 +105,8 @@ void FolderEditor::paintEvent(QPaintEvent* event)
 
 void FolderEditor::drawFrame(QPainter& painter) const
 {
-    const NineSlice::Triple places = NineSlice::row(rect(), mLeft.width(), mRight.width());
-    const QPixmap* pieces[] = {&mLeft, &mCenter, &mRight};
+    const NineSlice::Triple places = NineSlice::row(rect(), m_left.width(), m_right.width());
+    const QPixmap* pieces[] = {&m_left, &m_center, &m_right};
     for (size_t i = 0; i < places.size(); ++i)
         if (!pieces[i]->isNull() && !places[i].isEmpty())
             painter.drawPixmap(places[i], *pieces[i]);
@@ -117,8 +117,8 @@ void FolderEditor::drawFrame(QPainter& painter) const
 void FolderEditor::hideEvent(QHideEvent* event)
 {
     QLineEdit::hideEvent(event);
-    if (isHidden() && !mEnded) {
-        mEnded = true;
+    if (isHidden() && !m_ended) {
+        m_ended = true;
         Q_EMIT signalEditStateEnd();
     }
 }

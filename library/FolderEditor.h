@@ -44,9 +44,9 @@ private:
     void drawFrame(QPainter& painter) const;
     void sendMouse(QEvent::Type type, const QPointF& globalPosition);
 
-    QPixmap mLeft;
-    QPixmap mCenter;
-    QPixmap mRight;
-    OneFinger mFinger{this};
-    bool mEnded = false;
+    QPixmap m_left;
+    QPixmap m_center;
+    QPixmap m_right;
+    OneFinger m_finger{this};
+    bool m_ended = false;
 };

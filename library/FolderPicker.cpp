@@ -90,10 +90,10 @@ bool checkCanCreateNew(const FolderRows& rows, const QModelIndex& index)
 
 FolderPicker::FolderPicker(QWidget* parent)
     : QDialog(parent, Qt::Dialog | Qt::FramelessWindowHint)
-    , mRows(this)
-    , mMasks(this, FRAME)
-    , mBackground(QStringLiteral(":/ToolBarbg_bluegrid"))
-    , mSeparator(QStringLiteral(":/Separator_H"))
+    , m_rows(this)
+    , m_masks(this, FRAME)
+    , m_background(QStringLiteral(":/ToolBarbg_bluegrid"))
+    , m_separator(QStringLiteral(":/Separator_H"))
 {
     setObjectName(QStringLiteral("FolderPickerWindow"));
     setStyleSheet(QStringLiteral("QDialog#FolderPickerWindow {font-size:24px; background:rgb(50, 50, 50);}"));
@@ -101,7 +101,7 @@ FolderPicker::FolderPicker(QWidget* parent)
     setFixedSize(FOLDER_PICKER_SIZE);
     new WindowPlaceKeeper(this); // owned by this dialog
     createTree();
-    mEdit = std::make_unique<FolderNameEdit>(&mRows, mTree, nullptr);
+    m_edit = std::make_unique<FolderNameEdit>(&m_rows, m_tree, nullptr);
     createDetails();
     createButtons();
     connectTree();
@@ -116,11 +116,11 @@ FolderPicker::FolderPicker(QWidget* parent)
 FolderPicker::~FolderPicker()
 {
     // Deleted first, so that their signals do not reach a partly destroyed dialog.
-    const QPointer<FolderEditor> editor = mEdit->editor();
-    mEdit->cancelEdit();
+    const QPointer<FolderEditor> editor = m_edit->editor();
+    m_edit->cancelEdit();
     delete editor;
-    mTree->disconnect(this);
-    delete mTree;
+    m_tree->disconnect(this);
+    delete m_tree;
 }
 
 void FolderPicker::createTree()
@@ -130,37 +130,37 @@ void FolderPicker::createTree()
     const QPoint place(FOLDER_PICKER_SIZE.width() - SIDE_MARGIN - FOLDER_TREEVIEW_SIZE.width(),
                        STARTPOINT_OF_TOP_HSEPARATOR.y() + SEPARATOR_HEIGHT +
                            (between - FOLDER_TREEVIEW_SIZE.height()) / 2);
-    mTree = new KSTreeView(this);
-    mTree->setObjectName(QStringLiteral("folderTree"));
-    mTree->setGeometry(QRect(place, FOLDER_TREEVIEW_SIZE));
-    mTree->setModel(mRows.model());
-    mTree->setCheckBoxVisible(false);
-    mTree->setSortingEnabled(true);
-    mTree->setHorizontalScrollBarPolicy(Qt::ScrollBarAlwaysOff);
+    m_tree = new KSTreeView(this);
+    m_tree->setObjectName(QStringLiteral("folderTree"));
+    m_tree->setGeometry(QRect(place, FOLDER_TREEVIEW_SIZE));
+    m_tree->setModel(m_rows.model());
+    m_tree->setCheckBoxVisible(false);
+    m_tree->setSortingEnabled(true);
+    m_tree->setHorizontalScrollBarPolicy(Qt::ScrollBarAlwaysOff);
     // Otherwise the columns would change their width.
-    mTree->setVerticalScrollBarPolicy(Qt::ScrollBarAlwaysOn);
-    mTree->header()->setStretchLastSection(false);
-    mTree->header()->setSectionResizeMode(FolderPickerFactory::NameColumn, QHeaderView::Stretch);
-    mTree->header()->setSectionResizeMode(FolderPickerFactory::DateColumn, QHeaderView::Fixed);
-    mTree->header()->resizeSection(FolderPickerFactory::DateColumn, DATE_WIDTH);
+    m_tree->setVerticalScrollBarPolicy(Qt::ScrollBarAlwaysOn);
+    m_tree->header()->setStretchLastSection(false);
+    m_tree->header()->setSectionResizeMode(FolderPickerFactory::NameColumn, QHeaderView::Stretch);
+    m_tree->header()->setSectionResizeMode(FolderPickerFactory::DateColumn, QHeaderView::Fixed);
+    m_tree->header()->resizeSection(FolderPickerFactory::DateColumn, DATE_WIDTH);
 }
 
 void FolderPicker::createDetails()
 {
-    mTitle =
+    m_title =
         TitlePreview::createLabel(this,
                                   QRect(2 * FRAME_MARGIN, FRAME_MARGIN, HSEPARATOR_LENGTH - 2 * FRAME_MARGIN,
                                         STARTPOINT_OF_TOP_HSEPARATOR.y() - FRAME_MARGIN),
                                   "folderPickerTitle");
-    const int left = FRAME_MARGIN + (mTree->x() - FRAME_MARGIN - LEFT_WIDTH) / 2;
-    mPreview = std::make_unique<TitlePreview>(this, QPoint(left, mTree->y()));
+    const int left = FRAME_MARGIN + (m_tree->x() - FRAME_MARGIN - LEFT_WIDTH) / 2;
+    m_preview = std::make_unique<TitlePreview>(this, QPoint(left, m_tree->y()));
 }
 
 void FolderPicker::createButtons()
 {
     const char* names[] = {"duplicateFolderButton", "newFolderButton", "openFolderButton",
                            "cancelFolderButton"};
-    const int right = mTree->geometry().right() + 1;
+    const int right = m_tree->geometry().right() + 1;
     const int left = SIDE_MARGIN;
     const int step = BUTTON_SIZE.width() + BUTTON_SPACE;
     const int places[] = {left, left + step, right - step - BUTTON_SIZE.width(), right - BUTTON_SIZE.width()};
@@ -179,100 +179,100 @@ void FolderPicker::createButtons()
             button->changeButtonState(button->isEnabled() ? KSPushbutton::ButtonRest
                                                           : KSPushbutton::ButtonDisabled);
         });
-        mButtons[id] = button;
+        m_buttons[id] = button;
     }
-    connect(mButtons[DuplicateButton], &QAbstractButton::clicked, this, &FolderPicker::duplicateFolder);
-    connect(mButtons[CreateButton], &QAbstractButton::clicked, this, &FolderPicker::createFolder);
-    connect(mButtons[OpenButton], &QAbstractButton::clicked, this, &FolderPicker::openFolder);
-    connect(mButtons[CancelButton], &QAbstractButton::clicked, this, &FolderPicker::cancelFolder);
+    connect(m_buttons[DuplicateButton], &QAbstractButton::clicked, this, &FolderPicker::duplicateFolder);
+    connect(m_buttons[CreateButton], &QAbstractButton::clicked, this, &FolderPicker::createFolder);
+    connect(m_buttons[OpenButton], &QAbstractButton::clicked, this, &FolderPicker::openFolder);
+    connect(m_buttons[CancelButton], &QAbstractButton::clicked, this, &FolderPicker::cancelFolder);
 }
 
 void FolderPicker::connectTree()
 {
-    connect(mTree, &QAbstractItemView::pressed, this, &FolderPicker::pressedFolder);
-    connect(mTree, &QTreeView::collapsed, this, &FolderPicker::pressedFolder);
-    connect(mTree, &QTreeView::expanded, this, &FolderPicker::pressedFolder);
-    connect(mTree, &KSTreeView::signalCurrentChangedByTouch, this, &FolderPicker::slotCurrentChangedByTouch);
-    connect(mTree, &KSTreeView::signalPressedAndHold, this, &FolderPicker::startEditing);
-    connect(mTree->header(), &QHeaderView::sectionClicked, this, &FolderPicker::slotHeaderClicked);
-    connect(mEdit.get(), &FolderNameEdit::folderMoved, this, &FolderPicker::folderMoved);
-    connect(mEdit.get(), &FolderNameEdit::rowAdded, this, [this] { mPreview->clearThumbnailArea(); });
-    connect(mEdit.get(), &FolderNameEdit::unmadeRowDropped, this, [this](bool isFolderCurrent) {
-        mPreview->clearThumbnailArea();
+    connect(m_tree, &QAbstractItemView::pressed, this, &FolderPicker::pressedFolder);
+    connect(m_tree, &QTreeView::collapsed, this, &FolderPicker::pressedFolder);
+    connect(m_tree, &QTreeView::expanded, this, &FolderPicker::pressedFolder);
+    connect(m_tree, &KSTreeView::signalCurrentChangedByTouch, this, &FolderPicker::slotCurrentChangedByTouch);
+    connect(m_tree, &KSTreeView::signalPressedAndHold, this, &FolderPicker::startEditing);
+    connect(m_tree->header(), &QHeaderView::sectionClicked, this, &FolderPicker::slotHeaderClicked);
+    connect(m_edit.get(), &FolderNameEdit::folderMoved, this, &FolderPicker::folderMoved);
+    connect(m_edit.get(), &FolderNameEdit::rowAdded, this, [this] { m_preview->clearThumbnailArea(); });
+    connect(m_edit.get(), &FolderNameEdit::unmadeRowDropped, this, [this](bool isFolderCurrent) {
+        m_preview->clearThumbnailArea();
         if (isVisible())
             ChangeButtonState(isFolderCurrent ? ALL_BUTTONS : NEW_FOLDER_AND_CANCEL);
     });
-    for (QObject* object : std::initializer_list<QObject*>{mTree, mTree->viewport(), mTree->header(),
-                                                           mTree->header()->viewport()})
+    for (QObject* object : std::initializer_list<QObject*>{m_tree, m_tree->viewport(), m_tree->header(),
+                                                           m_tree->header()->viewport()})
         object->installEventFilter(this);
 }
 
 void FolderPicker::ChangeButtonState(folderButtonState state)
 {
     const bool none = state == NO_BUTTONS;
-    mButtons[DuplicateButton]->setEnabled(!none && state != NO_DUPLICATE && state != OPEN_AND_CANCEL &&
-                                          state != NEW_FOLDER_AND_CANCEL);
-    mButtons[CreateButton]->setEnabled(!none && state != OPEN_AND_CANCEL);
-    mButtons[OpenButton]->setEnabled(!none && state != NEW_FOLDER_AND_CANCEL);
-    mButtons[CancelButton]->setEnabled(!none);
+    m_buttons[DuplicateButton]->setEnabled(!none && state != NO_DUPLICATE && state != OPEN_AND_CANCEL &&
+                                           state != NEW_FOLDER_AND_CANCEL);
+    m_buttons[CreateButton]->setEnabled(!none && state != OPEN_AND_CANCEL);
+    m_buttons[OpenButton]->setEnabled(!none && state != NEW_FOLDER_AND_CANCEL);
+    m_buttons[CancelButton]->setEnabled(!none);
 }
 
 void FolderPicker::setDuplicateButtonEnabled(bool enabled)
 {
-    mButtons[DuplicateButton]->setEnabled(enabled);
+    m_buttons[DuplicateButton]->setEnabled(enabled);
 }
 
 void FolderPicker::setCreateFolderButtonEnabled(bool enabled)
 {
-    mButtons[CreateButton]->setEnabled(enabled);
+    m_buttons[CreateButton]->setEnabled(enabled);
 }
 
 void FolderPicker::setCancelButtonEnabled(bool enabled)
 {
-    mButtons[CancelButton]->setEnabled(enabled);
+    m_buttons[CancelButton]->setEnabled(enabled);
 }
 
 void FolderPicker::setSystemLanFont(QFont font)
 {
     font.setPixelSize(TITLE_FONT_SIZE);
-    mTitle->setFont(font);
+    m_title->setFont(font);
     font.setPixelSize(FONT_SIZE);
-    mPreview->setFont(font);
-    for (KSPushbutton* button : mButtons)
+    m_preview->setFont(font);
+    for (KSPushbutton* button : m_buttons)
         button->setFont(font);
-    mTree->header()->setFont(font);
-    mRows.factory()->setItemFont(font);
-    mRows.model()->setAttributeOfAll(Qt::FontRole, font);
+    m_tree->header()->setFont(font);
+    m_rows.factory()->setItemFont(font);
+    m_rows.model()->setAttributeOfAll(Qt::FontRole, font);
 }
 
 void FolderPicker::translateText()
 {
-    mTitle->setText(tr("Select Folder"));
-    mUntitled = tr("Untitled");
-    mButtons[DuplicateButton]->setText(tr("Duplicate"));
-    mButtons[CreateButton]->setText(tr("New Folder"));
-    mButtons[OpenButton]->setText(tr("Open"));
-    mButtons[CancelButton]->setText(tr("Cancel"));
-    mRows.model()->setHeaderData(FolderPickerFactory::NameColumn, Qt::Horizontal, tr("Name"));
-    mRows.model()->setHeaderData(FolderPickerFactory::DateColumn, Qt::Horizontal, tr("Date"));
+    m_title->setText(tr("Select Folder"));
+    m_untitled = tr("Untitled");
+    m_buttons[DuplicateButton]->setText(tr("Duplicate"));
+    m_buttons[CreateButton]->setText(tr("New Folder"));
+    m_buttons[OpenButton]->setText(tr("Open"));
+    m_buttons[CancelButton]->setText(tr("Cancel"));
+    m_rows.model()->setHeaderData(FolderPickerFactory::NameColumn, Qt::Horizontal, tr("Name"));
+    m_rows.model()->setHeaderData(FolderPickerFactory::DateColumn, Qt::Horizontal, tr("Date"));
 }
 
 void FolderPicker::showOpacityWidget(bool show)
 {
-    if (mOpacity == nullptr)
-        mOpacity = DialogMasks::createMask(this, rect());
-    mOpacity->raise();
-    mOpacity->setVisible(show);
+    if (m_opacity == nullptr)
+        m_opacity = DialogMasks::createMask(this, rect());
+    m_opacity->raise();
+    m_opacity->setVisible(show);
 }
 
 void FolderPicker::updateTreeView()
 {
-    mEdit->cancelEdit();
-    mRows.reload();
-    mTree->scrollToTop();
-    mPreview->clearThumbnailArea();
-    mButtons[DuplicateButton]->setEnabled(false);
-    mButtons[OpenButton]->setEnabled(false);
+    m_edit->cancelEdit();
+    m_rows.reload();
+    m_tree->scrollToTop();
+    m_preview->clearThumbnailArea();
+    m_buttons[DuplicateButton]->setEnabled(false);
+    m_buttons[OpenButton]->setEnabled(false);
 }
 
 // --- The tree -------------------------------------------------------------------------------------------
@@ -284,17 +284,17 @@ void FolderPicker::pressedFolder(QModelIndex indexPress)
     // Expanding or collapsing a folder selects it, so that the buttons act on what was touched last. A
     // selected title of the folder stays selected while it is visible.
     const QPersistentModelIndex pressed = indexPress.siblingAtColumn(FolderPickerFactory::NameColumn);
-    if (mRows.folderOf(mTree->currentIndex()) != mRows.folderOf(pressed) ||
-        isCurrentHiddenBy(*mTree, pressed))
-        mTree->setCurrentIndex(pressed);
-    const QModelIndex current = mTree->currentIndex();
-    if (mRows.checkItemisFolder(current)) {
+    if (m_rows.folderOf(m_tree->currentIndex()) != m_rows.folderOf(pressed) ||
+        isCurrentHiddenBy(*m_tree, pressed))
+        m_tree->setCurrentIndex(pressed);
+    const QModelIndex current = m_tree->currentIndex();
+    if (m_rows.checkItemisFolder(current)) {
         ChangeButtonState(ALL_BUTTONS);
-        mPreview->clearThumbnailArea();
+        m_preview->clearThumbnailArea();
         return;
     }
     ChangeButtonState(NO_DUPLICATE);
-    mPreview->updateThumbnailArea(mRows.titleFile(current).filePath());
+    m_preview->updateThumbnailArea(m_rows.titleFile(current).filePath());
 }
 
 void FolderPicker::slotCurrentChangedByTouch(QModelIndex)
@@ -304,8 +304,8 @@ void FolderPicker::slotCurrentChangedByTouch(QModelIndex)
 
 void FolderPicker::slotHeaderClicked(int column)
 {
-    const QString name = mRows.model()->headerData(column, Qt::Horizontal).toString();
-    const bool ascending = mTree->header()->sortIndicatorOrder() == Qt::AscendingOrder;
+    const QString name = m_rows.model()->headerData(column, Qt::Horizontal).toString();
+    const bool ascending = m_tree->header()->sortIndicatorOrder() == Qt::AscendingOrder;
     LOG_USER_OPERATE(L"File List", 200,
                      L"Sort by Column: " + name.toStdWString() +
                          (ascending ? L" in AscendingOrder order" : L" in DescendingOrder order"));
@@ -313,18 +313,18 @@ void FolderPicker::slotHeaderClicked(int column)
 
 void FolderPicker::startEditing(QModelIndex index)
 {
-    if (mEdit->isActive() || !index.isValid() || index.column() != FolderPickerFactory::NameColumn ||
-        !mRows.checkItemisFolder(index) || !index.data(KSVIEW::ItemEditableRole).toBool() ||
+    if (m_edit->isActive() || !index.isValid() || index.column() != FolderPickerFactory::NameColumn ||
+        !m_rows.checkItemisFolder(index) || !index.data(KSVIEW::ItemEditableRole).toBool() ||
         isVanished(index))
         return;
-    mEdit->startRename(index);
+    m_edit->startRename(index);
 }
 
 // Returns whether the folder was deleted without a notice by another process, and removes its row then.
 bool FolderPicker::isVanished(const QModelIndex& index)
 {
-    const QString name = mRows.nameOf(mRows.folderOf(index));
-    if (!index.isValid() || mRows.disk().isTitleFolder(mRows.regetRootPath(), name))
+    const QString name = m_rows.nameOf(m_rows.folderOf(index));
+    if (!index.isValid() || m_rows.disk().isTitleFolder(m_rows.regetRootPath(), name))
         return false;
     slotDeleteFolder(name.toStdWString());
     return true;
@@ -332,8 +332,8 @@ bool FolderPicker::isVanished(const QModelIndex& index)
 
 void FolderPicker::showSoftKeyboard()
 {
-    if (mEdit->isActive())
-        mEdit->callSoftKeyBoard();
+    if (m_edit->isActive())
+        m_edit->callSoftKeyBoard();
 }
 
 // --- The buttons ----------------------------------------------------------------------------------------
@@ -341,7 +341,7 @@ void FolderPicker::showSoftKeyboard()
 // Ends the edit of a name before another action. Returns true when the edit has to continue.
 bool FolderPicker::isEditKept()
 {
-    return mEdit->isActive() && mEdit->renameAction();
+    return m_edit->isActive() && m_edit->renameAction();
 }
 
 void FolderPicker::createFolder()
@@ -349,11 +349,11 @@ void FolderPicker::createFolder()
     logTap(L"Tap New Folder Button");
     if (isEditKept())
         return;
-    if (mRows.disk().isDiskFull(mRows.regetRootPath(), false)) {
+    if (m_rows.disk().isDiskFull(m_rows.regetRootPath(), false)) {
         ListMessages::post(MessageDef::MESSAGE_DISK_FULL_ON_CREATE, tr("folder"));
         return;
     }
-    if (mEdit->startCreate(mUntitled))
+    if (m_edit->startCreate(m_untitled))
         ChangeButtonState(ALL_BUTTONS);
 }
 
@@ -362,16 +362,16 @@ void FolderPicker::duplicateFolder()
     logTap(L"Tap Duplicate Button");
     if (isEditKept())
         return;
-    const QModelIndex source = mRows.folderOf(mTree->currentIndex());
+    const QModelIndex source = m_rows.folderOf(m_tree->currentIndex());
     if (!source.isValid() || isVanished(source))
         return;
-    const QString name = mRows.nameOf(source);
-    mRows.regetRootPath();
-    if (mRows.disk().isDiskFull(mRows.folderPath(name), true)) {
+    const QString name = m_rows.nameOf(source);
+    m_rows.regetRootPath();
+    if (m_rows.disk().isDiskFull(m_rows.folderPath(name), true)) {
         ListMessages::post(MessageDef::MESSAGE_DISK_FULL_ON_DUPLICATE, tr("folder"));
         return;
     }
-    mEdit->startDuplicate(name, source);
+    m_edit->startDuplicate(name, source);
 }
 
 void FolderPicker::openFolder()
@@ -379,19 +379,19 @@ void FolderPicker::openFolder()
     logTap(L"Tap Open Button");
     if (isEditKept())
         return;
-    const QModelIndex current = mTree->currentIndex().siblingAtColumn(FolderPickerFactory::NameColumn);
-    if (!current.isValid() || isVanished(current) || !checkCanShowTemplate(mRows, current) ||
-        !checkCanCreateNew(mRows, current))
+    const QModelIndex current = m_tree->currentIndex().siblingAtColumn(FolderPickerFactory::NameColumn);
+    if (!current.isValid() || isVanished(current) || !checkCanShowTemplate(m_rows, current) ||
+        !checkCanCreateNew(m_rows, current))
         return;
-    const QString name = mRows.nameOf(mRows.folderOf(current));
-    mKeepDialog = false;
-    if (mRows.checkItemisFolder(current))
-        Q_EMIT changeFolderPath(mRows.folderPath(name));
+    const QString name = m_rows.nameOf(m_rows.folderOf(current));
+    m_keepDialog = false;
+    if (m_rows.checkItemisFolder(current))
+        Q_EMIT changeFolderPath(m_rows.folderPath(name));
     else
-        Q_EMIT changeFolderFile(mRows.folderPath(name), mRows.titleFile(current).fileName());
+        Q_EMIT changeFolderFile(m_rows.folderPath(name), m_rows.titleFile(current).fileName());
     setCurrentFolderName(name);
-    if (mKeepDialog) {
-        mKeepDialog = false;
+    if (m_keepDialog) {
+        m_keepDialog = false;
         return;
     }
     if (KSInputContext* context = KSInputContext::instance(); context && parentWidget())
@@ -403,7 +403,7 @@ void FolderPicker::openFolder()
 void FolderPicker::cancelFolder()
 {
     logTap(L"Tap Cancel Button");
-    mEdit->cancelEdit();
+    m_edit->cancelEdit();
     done(Rejected);
     Q_EMIT signalCancelClicked();
 }
@@ -416,15 +416,15 @@ void FolderPicker::folderNameChanged(FileManagerDefine::tagChangeFolderNameParam
     const QString after = plainName(param.newPath);
     if (!FolderNameRules::isFolderName(before) || !FolderNameRules::isFolderName(after))
         return;
-    const QString oldPath = mRows.regetRootPath() + QLatin1Char('/') + before;
-    const QString newPath = mRows.folderPath(after);
-    if (!mRows.disk().staysBelow(mRows.regetRootPath(), after)) {
+    const QString oldPath = m_rows.regetRootPath() + QLatin1Char('/') + before;
+    const QString newPath = m_rows.folderPath(after);
+    if (!m_rows.disk().staysBelow(m_rows.regetRootPath(), after)) {
         ConfinedPath::logRefusal(L"a folder is said to be called like a link: ", newPath.toStdString());
         return;
     }
     Q_EMIT folderMoved(oldPath, newPath);
-    if (mRows.isNameOf(before, currentFolderName())) {
-        mRows.openFolderRenamed(after);
+    if (m_rows.isNameOf(before, currentFolderName())) {
+        m_rows.openFolderRenamed(after);
         Q_EMIT folderNameChange(oldPath, newPath);
         // The undo steps, including that of text just being typed, contain the old path.
         Q_EMIT clearUndoCommandStack();
@@ -435,39 +435,39 @@ void FolderPicker::folderNameChanged(FileManagerDefine::tagChangeFolderNameParam
 
 void FolderPicker::renameRow(const QString& before, const QString& after)
 {
-    mEdit->sourceRenamed(before, after);
-    mRows.factory()->renameFolder(before, after);
-    if (mEdit->isRenaming(before)) {
+    m_edit->sourceRenamed(before, after);
+    m_rows.factory()->renameFolder(before, after);
+    if (m_edit->isRenaming(before)) {
         continuefolderNameChanged(after); // continues the edit from the new name
         return;
     }
-    const QModelIndex index = mRows.getFolderIndex(before, mEdit->row());
+    const QModelIndex index = m_rows.getFolderIndex(before, m_edit->row());
     if (index.isValid()) {
-        mRows.setAttributeAtDoEdit(index, after);
-        mRows.insertChildrenIndex(index, after);
+        m_rows.setAttributeAtDoEdit(index, after);
+        m_rows.insertChildrenIndex(index, after);
     }
-    mRows.factory()->importSourceData();
-    mTree->viewport()->update();
+    m_rows.factory()->importSourceData();
+    m_tree->viewport()->update();
 }
 
 void FolderPicker::slotDeleteFolder(std::wstring name)
 {
     const QString folder = plainName(name);
-    const QString path = mRows.folderPath(folder);
+    const QString path = m_rows.folderPath(folder);
     if (FolderNameRules::isFolderName(folder) && !QFileInfo::exists(path))
         RefusedWrites::forgetFolder(path.toStdString()); // pending writes for a deleted folder are dropped
-    if (mRows.isNameOf(folder, currentFolderName()))
+    if (m_rows.isNameOf(folder, currentFolderName()))
         setCurrentFolderName(QString());
-    const QModelIndex index = mRows.getFolderIndex(folder, mEdit->unmadeRow());
+    const QModelIndex index = m_rows.getFolderIndex(folder, m_edit->unmadeRow());
     if (!index.isValid())
         return;
-    const QModelIndex current = mRows.folderOf(mTree->currentIndex());
+    const QModelIndex current = m_rows.folderOf(m_tree->currentIndex());
     if (isVisible() && current.isValid() && current == index) {
         ChangeButtonState(NEW_FOLDER_AND_CANCEL);
-        mTree->setCurrentIndex(QModelIndex());
-        mPreview->clearThumbnailArea();
+        m_tree->setCurrentIndex(QModelIndex());
+        m_preview->clearThumbnailArea();
     }
-    mRows.remove(index);
+    m_rows.remove(index);
 }
 
 // --- Events ---------------------------------------------------------------------------------------------
@@ -480,13 +480,13 @@ void FolderPicker::paintEvent(QPaintEvent* event)
     const QRect inside = rect().marginsRemoved(FRAME);
     painter.fillRect(inside, QColor(50, 50, 50));
     painter.setClipRect(inside);
-    painter.drawPixmap(0, 0, mBackground);
+    painter.drawPixmap(0, 0, m_background);
     painter.setClipping(false);
     painter.setPen(FRAME_LINE_COLOR);
     painter.drawRect(inside.adjusted(0, 0, -1, -1));
     painter.drawRect(rect().adjusted(0, 0, -1, -1));
     for (const QPoint& start : {STARTPOINT_OF_TOP_HSEPARATOR, STARTPOINT_OF_BOTTOM_HSEPARATOR})
-        painter.drawImage(QRect(start, QSize(HSEPARATOR_LENGTH, SEPARATOR_HEIGHT)), mSeparator);
+        painter.drawImage(QRect(start, QSize(HSEPARATOR_LENGTH, SEPARATOR_HEIGHT)), m_separator);
 }
 
 void FolderPicker::showEvent(QShowEvent* event)
@@ -500,15 +500,15 @@ void FolderPicker::showEvent(QShowEvent* event)
 void FolderPicker::hideEvent(QHideEvent* event)
 {
     if (!event->spontaneous()) {
-        mEdit->cancelEdit();
-        mEdit->forgetMessage();
+        m_edit->cancelEdit();
+        m_edit->forgetMessage();
     }
     QDialog::hideEvent(event);
 }
 
 void FolderPicker::reject()
 {
-    if (mButtons[CancelButton]->isEnabled())
+    if (m_buttons[CancelButton]->isEnabled())
         cancelFolder();
 }
 
@@ -539,7 +539,7 @@ bool FolderPicker::filterWhileEditing(QEvent* event)
     case QEvent::MouseButtonRelease:
     case QEvent::TouchUpdate:
     case QEvent::TouchEnd:
-        return mEdit->isMessageUp();
+        return m_edit->isMessageUp();
     case QEvent::MouseButtonPress:
     case QEvent::MouseButtonDblClick:
     case QEvent::TouchBegin:

@@ -63,8 +63,8 @@ public:
     ~FolderPicker() override;
 
     // Marks the folder that is open in the editor, which cannot be renamed meanwhile. Empty for none.
-    void setCurrentFolderName(const QString& name) { mRows.setOpenFolder(name); }
-    QString currentFolderName() const { return mRows.openFolder(); }
+    void setCurrentFolderName(const QString& name) { m_rows.setOpenFolder(name); }
+    QString currentFolderName() const { return m_rows.openFolder(); }
     void setSystemLanFont(QFont font);
     void translateText();
     // Reads all folders again; drops the selection and an edit.
@@ -78,17 +78,17 @@ public:
 
     // Keeps this dialog open when the folder being opened needs a template and none is picked in the dialog
     // above.
-    void setKeepFolderDialog() { mKeepDialog = true; }
+    void setKeepFolderDialog() { m_keepDialog = true; }
     // Darkens this dialog while another dialog of this process is above it.
     void showOpacityWidget(bool show);
-    void showDialogMaskWidget(bool show) { mMasks.showDialogMaskWidget(show); }
-    void showMessageMaskWidget(bool show) { mMasks.showMessageMaskWidget(show); }
+    void showDialogMaskWidget(bool show) { m_masks.showDialogMaskWidget(show); }
+    void showMessageMaskWidget(bool show) { m_masks.showMessageMaskWidget(show); }
 
-    KSTreeView* treeView() const { return mTree; }
-    KSTreeModel* treeModel() const { return mRows.model(); }
+    KSTreeView* treeView() const { return m_tree; }
+    KSTreeModel* treeModel() const { return m_rows.model(); }
     // Returns the field, or null while no name is being edited.
-    FolderEditor* editor() const { return mEdit->editor(); }
-    FolderEdit editAction() const { return mEdit->action(); }
+    FolderEditor* editor() const { return m_edit->editor(); }
+    FolderEdit editAction() const { return m_edit->action(); }
 
 Q_SIGNALS:
     // Emitted when the operator has picked a folder or a title. Full paths of folders; the name of a title
@@ -119,21 +119,21 @@ public Q_SLOTS:
     void slotHeaderClicked(int column);
 
     // Slots of the editor
-    void slotCreateEditor(FolderEditor* editor) { mEdit->slotCreateEditor(editor); }
-    void slotPressedClose() { mEdit->slotPressedClose(); }
-    void slotPressedEnter() { mEdit->slotPressedEnter(); }
-    void slotEditStateEnd() { mEdit->slotEditStateEnd(); }
-    void slotInvalidInput() { mEdit->slotInvalidInput(); }
-    void slotLongInput() { mEdit->slotLongInput(); }
-    void slotValidInput() { mEdit->slotValidInput(); }
+    void slotCreateEditor(FolderEditor* editor) { m_edit->slotCreateEditor(editor); }
+    void slotPressedClose() { m_edit->slotPressedClose(); }
+    void slotPressedEnter() { m_edit->slotPressedEnter(); }
+    void slotEditStateEnd() { m_edit->slotEditStateEnd(); }
+    void slotInvalidInput() { m_edit->slotInvalidInput(); }
+    void slotLongInput() { m_edit->slotLongInput(); }
+    void slotValidInput() { m_edit->slotValidInput(); }
     void slotTextChanged(QString) {} // the field itself keeps the text
     // Called when a message box was closed.
-    void reCallcallSoftKeyBoard(MessageDefine::tagCloseParam param) { mEdit->messageClosed(param); }
+    void reCallcallSoftKeyBoard(MessageDefine::tagCloseParam param) { m_edit->messageClosed(param); }
 
     // Called when another process renamed or deleted a folder. Takes names or full paths, of which the last
     // part is used.
     void folderNameChanged(FileManagerDefine::tagChangeFolderNameParam param);
-    void continuefolderNameChanged(QString after) { mEdit->goOnFrom(after); }
+    void continuefolderNameChanged(QString after) { m_edit->goOnFrom(after); }
     void slotDeleteFolder(std::wstring name);
 
     // Called on Escape and by the window manager: acts like Cancel if that is enabled.
@@ -158,16 +158,16 @@ private:
     void renameRow(const QString& before, const QString& after);
     bool filterWhileEditing(QEvent* event);
 
-    FolderRows mRows;
-    KSTreeView* mTree = nullptr;
-    std::unique_ptr<FolderNameEdit> mEdit;
-    KSPushbutton* mButtons[ButtonCount] = {};
-    QLabel* mTitle = nullptr;
-    std::unique_ptr<TitlePreview> mPreview;
-    QWidget* mOpacity = nullptr;
-    DialogMasks mMasks;
-    QPixmap mBackground;
-    QImage mSeparator;
-    QString mUntitled;
-    bool mKeepDialog = false;
+    FolderRows m_rows;
+    KSTreeView* m_tree = nullptr;
+    std::unique_ptr<FolderNameEdit> m_edit;
+    KSPushbutton* m_buttons[ButtonCount] = {};
+    QLabel* m_title = nullptr;
+    std::unique_ptr<TitlePreview> m_preview;
+    QWidget* m_opacity = nullptr;
+    DialogMasks m_masks;
+    QPixmap m_background;
+    QImage m_separator;
+    QString m_untitled;
+    bool m_keepDialog = false;
 };

@@ -59,26 +59,26 @@ QWidget* FolderPickerFactory::createControl(QWidget* parent, _controlType, const
 
 void FolderPickerFactory::importSourceData()
 {
-    mFolders.clear();
-    mTitleInfos.clear();
-    mTitleNames.clear();
-    mHasTitles.clear();
-    if (mRootPath.isEmpty())
+    m_folders.clear();
+    m_titleInfos.clear();
+    m_titleNames.clear();
+    m_hasTitles.clear();
+    if (m_rootPath.isEmpty())
         return;
     const QStringList names =
-        QDir(mRootPath).entryList(QDir::Dirs | QDir::NoDotAndDotDot, QDir::Name | QDir::IgnoreCase);
+        QDir(m_rootPath).entryList(QDir::Dirs | QDir::NoDotAndDotDot, QDir::Name | QDir::IgnoreCase);
     for (const QString& name : names)
-        if (mDisk.isTitleFolder(mRootPath, name))
-            mFolders.append(folderOf(takeFolder(name)));
+        if (m_disk.isTitleFolder(m_rootPath, name))
+            m_folders.append(folderOf(takeFolder(name)));
 }
 
 void* FolderPickerFactory::takeFolder(const QString& name)
 {
-    int number = mNumbers.value(name);
+    int number = m_numbers.value(name);
     if (number == 0) {
-        number = static_cast<int>(mFolderNames.size()) + 1;
-        mNumbers.insert(name, number);
-        mFolderNames.insert(number, name);
+        number = static_cast<int>(m_folderNames.size()) + 1;
+        m_numbers.insert(name, number);
+        m_folderNames.insert(number, name);
     }
     forgetTitles(number);
     return nodeOf(number);
@@ -86,14 +86,14 @@ void* FolderPickerFactory::takeFolder(const QString& name)
 
 void FolderPickerFactory::renameFolder(const QString& oldName, const QString& newName)
 {
-    const int number = mNumbers.take(oldName);
+    const int number = m_numbers.take(oldName);
     if (number == 0)
         return;
     // Another folder that had the new name does not exist any more; its number gets an empty name.
-    if (const int gone = mNumbers.value(newName); gone != 0)
-        mFolderNames[gone] = QString();
-    mNumbers.insert(newName, number);
-    mFolderNames[number] = newName;
+    if (const int gone = m_numbers.value(newName); gone != 0)
+        m_folderNames[gone] = QString();
+    m_numbers.insert(newName, number);
+    m_folderNames[number] = newName;
     forgetTitles(number);
 }
 
@@ -103,8 +103,8 @@ void FolderPickerFactory::getChildInfo(const QString& path, int folder)
     const QList<QFileInfo> titles = getTitlerFiles(folder, path);
     for (const QFileInfo& title : titles)
         names.append(title.completeBaseName());
-    mTitleInfos.insert(folder, titles);
-    mTitleNames.insert(folder, names);
+    m_titleInfos.insert(folder, titles);
+    m_titleNames.insert(folder, names);
 }
 
 QList<QFileInfo> FolderPickerFactory::getTitlerFiles(int, const QString& path)
@@ -115,7 +115,7 @@ QList<QFileInfo> FolderPickerFactory::getTitlerFiles(int, const QString& path)
 QList<QFileInfo> FolderPickerFactory::firstTitlerFiles(const QString& path, qsizetype most) const
 {
     QList<QFileInfo> titles;
-    if (mDisk.isNullDirectory(QFileInfo(path)))
+    if (m_disk.isNullDirectory(QFileInfo(path)))
         return titles;
     for (const ArchiveOrder& row : FolderOrder::rowsToShow(path.toStdString())) {
         const QString name = QString::fromStdString(row.getArchivePath());
@@ -132,31 +132,31 @@ QList<QFileInfo> FolderPickerFactory::firstTitlerFiles(const QString& path, qsiz
 
 void FolderPickerFactory::forgetTitles(int folder)
 {
-    mTitleInfos.remove(folder);
-    mTitleNames.remove(folder);
-    mHasTitles.remove(folder);
+    m_titleInfos.remove(folder);
+    m_titleNames.remove(folder);
+    m_hasTitles.remove(folder);
 }
 
 // The result is kept, since a view calls this for every row that it paints.
 bool FolderPickerFactory::hasTitles(int folder)
 {
-    if (mTitleInfos.contains(folder))
-        return !mTitleInfos.value(folder).isEmpty();
-    const QString name = mFolderNames.value(folder);
+    if (m_titleInfos.contains(folder))
+        return !m_titleInfos.value(folder).isEmpty();
+    const QString name = m_folderNames.value(folder);
     if (name.isEmpty())
         return false;
-    auto known = mHasTitles.constFind(folder);
-    if (known == mHasTitles.constEnd())
+    auto known = m_hasTitles.constFind(folder);
+    if (known == m_hasTitles.constEnd())
         known =
-            mHasTitles.insert(folder, !firstTitlerFiles(mRootPath + QLatin1Char('/') + name, 1).isEmpty());
+            m_hasTitles.insert(folder, !firstTitlerFiles(m_rootPath + QLatin1Char('/') + name, 1).isEmpty());
     return *known;
 }
 
 void FolderPickerFactory::ensureChildInfo(int folder)
 {
-    const QString name = mFolderNames.value(folder);
-    if (!name.isEmpty() && !mTitleInfos.contains(folder))
-        getChildInfo(mRootPath + QLatin1Char('/') + name, folder);
+    const QString name = m_folderNames.value(folder);
+    if (!name.isEmpty() && !m_titleInfos.contains(folder))
+        getChildInfo(m_rootPath + QLatin1Char('/') + name, folder);
 }
 
 void* FolderPickerFactory::getNextNode(void* node)
@@ -165,51 +165,51 @@ void* FolderPickerFactory::getNextNode(void* node)
     const int title = titleOf(node);
     if (title >= 0) {
         ensureChildInfo(folder);
-        return title + 1 < mTitleInfos.value(folder).size() ? nodeOf(folder, title + 1) : nullptr;
+        return title + 1 < m_titleInfos.value(folder).size() ? nodeOf(folder, title + 1) : nullptr;
     }
-    const qsizetype place = mFolders.indexOf(folder);
-    return place >= 0 && place + 1 < mFolders.size() ? nodeOf(mFolders.at(place + 1)) : nullptr;
+    const qsizetype place = m_folders.indexOf(folder);
+    return place >= 0 && place + 1 < m_folders.size() ? nodeOf(m_folders.at(place + 1)) : nullptr;
 }
 
 bool FolderPickerFactory::hasChildNode(void* node)
 {
-    return node == nullptr ? !mFolders.isEmpty() : titleOf(node) < 0 && hasTitles(folderOf(node));
+    return node == nullptr ? !m_folders.isEmpty() : titleOf(node) < 0 && hasTitles(folderOf(node));
 }
 
 void* FolderPickerFactory::getChildNode(void* node)
 {
     if (node == nullptr)
-        return mFolders.isEmpty() ? nullptr : nodeOf(mFolders.constFirst());
+        return m_folders.isEmpty() ? nullptr : nodeOf(m_folders.constFirst());
     if (titleOf(node) >= 0)
         return nullptr;
     ensureChildInfo(folderOf(node));
-    return mTitleInfos.value(folderOf(node)).isEmpty() ? nullptr : nodeOf(folderOf(node), 0);
+    return m_titleInfos.value(folderOf(node)).isEmpty() ? nullptr : nodeOf(folderOf(node), 0);
 }
 
 QFileInfo FolderPickerFactory::getNewFolderInfo(const QString& name) const
 {
-    return QFileInfo(mRootPath + QLatin1Char('/') + name);
+    return QFileInfo(m_rootPath + QLatin1Char('/') + name);
 }
 
 QFileInfo FolderPickerFactory::getNodeInfo(void* node)
 {
     const int folder = folderOf(node);
-    const QString name = mFolderNames.value(folder);
+    const QString name = m_folderNames.value(folder);
     if (name.isEmpty())
         return {};
     if (titleOf(node) < 0)
         return getNewFolderInfo(name);
     ensureChildInfo(folder);
-    return mTitleInfos.value(folder).value(titleOf(node));
+    return m_titleInfos.value(folder).value(titleOf(node));
 }
 
 void FolderPickerFactory::InstallItemAttribute(KSModelAttributeItem* item, void* node)
 {
     const QFileInfo info = getNodeInfo(node);
     if (titleOf(node) < 0)
-        setFolderAttribute(item, mFolderNames.value(folderOf(node)), info);
+        setFolderAttribute(item, m_folderNames.value(folderOf(node)), info);
     else
-        setAttributes(item, mTitleNames.value(folderOf(node)).value(titleOf(node)), info.lastModified(),
+        setAttributes(item, m_titleNames.value(folderOf(node)).value(titleOf(node)), info.lastModified(),
                       false);
 }
 
@@ -255,7 +255,7 @@ void FolderPickerFactory::setEditAttribute(KSModelAttributeItem* item, const QSt
 
 void FolderPickerFactory::setFontAttribute(KSModelAttributeItem* item) const
 {
-    item->setAttribute(Qt::FontRole, mFont, NameColumn);
+    item->setAttribute(Qt::FontRole, m_font, NameColumn);
 }
 
 void FolderPickerFactory::setTextAlignmentAttribute(KSModelAttributeItem* item) const

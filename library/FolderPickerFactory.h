@@ -32,9 +32,9 @@ public:
     explicit FolderPickerFactory(QObject* parent = nullptr);
 
     // Sets the root, without a slash at its end; call importSourceData() to read it.
-    void setRootPath(const QString& path) { mRootPath = path; }
+    void setRootPath(const QString& path) { m_rootPath = path; }
     // Sets the font of the rows that are made from now on.
-    void setItemFont(const QFont& font) { mFont = font; }
+    void setItemFont(const QFont& font) { m_font = font; }
 
     // Creates an editor for the name cell of a folder and emits signalCreateEditor(); null for other cells.
     QWidget* createControl(QWidget* parent, _controlType type, const QModelIndex& index) override;
@@ -84,13 +84,13 @@ private:
     void setItemEditableAttribute(KSModelAttributeItem* item, bool folder) const;
     void setitemOtherAttribute(KSModelAttributeItem* item, const QDateTime& date, bool folder) const;
 
-    FolderPickerController mDisk;
-    QString mRootPath;
-    QFont mFont;
-    QList<int> mFolders;                     // in display order
-    QHash<QString, int> mNumbers;            // by name, of all folders seen so far
-    QMap<int, QString> mFolderNames;         // names by number
-    QMap<int, QList<QFileInfo>> mTitleInfos; // of the folders whose titles were read
-    QMap<int, QStringList> mTitleNames;
-    QMap<int, bool> mHasTitles; // results of hasTitles()
+    FolderPickerController m_disk;
+    QString m_rootPath;
+    QFont m_font;
+    QList<int> m_folders;                     // in display order
+    QHash<QString, int> m_numbers;            // by name, of all folders seen so far
+    QMap<int, QString> m_folderNames;         // names by number
+    QMap<int, QList<QFileInfo>> m_titleInfos; // of the folders whose titles were read
+    QMap<int, QStringList> m_titleNames;
+    QMap<int, bool> m_hasTitles; // results of hasTitles()
 };

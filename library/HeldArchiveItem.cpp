@@ -9,12 +9,12 @@ HeldArchiveItem::HeldArchiveItem(ArchiveItem* item)
 
 HeldArchiveItem::HeldArchiveItem(const HeldArchiveItem& other)
 {
-    hold(other.mItem);
+    hold(other.m_item);
 }
 
 HeldArchiveItem& HeldArchiveItem::operator=(const HeldArchiveItem& other)
 {
-    hold(other.mItem);
+    hold(other.m_item);
     return *this;
 }
 
@@ -27,7 +27,7 @@ void HeldArchiveItem::hold(ArchiveItem* item)
 {
     if (item)
         item->hold();
-    if (mItem)
-        mItem->letGo();
-    mItem = item;
+    if (m_item)
+        m_item->letGo();
+    m_item = item;
 }

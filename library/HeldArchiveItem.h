@@ -14,11 +14,11 @@ public:
     HeldArchiveItem& operator=(const HeldArchiveItem& other);
     ~HeldArchiveItem();
 
-    operator ArchiveItem*() const { return mItem; }
-    ArchiveItem* operator->() const { return mItem; }
+    operator ArchiveItem*() const { return m_item; }
+    ArchiveItem* operator->() const { return m_item; }
 
 private:
     void hold(ArchiveItem* item);
 
-    QPointer<ArchiveItem> mItem;
+    QPointer<ArchiveItem> m_item;
 };

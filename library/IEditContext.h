@@ -17,11 +17,11 @@ public:
     virtual void deleteFilePath(std::wstring fileName) = 0;
 
     // Returns the instance, which is not owned; null means that there is no request. GUI thread.
-    static IEditContext* instance() { return sInstance; }
-    static void setInstance(IEditContext* context) { sInstance = context; }
+    static IEditContext* instance() { return s_instance; }
+    static void setInstance(IEditContext* context) { s_instance = context; }
     // Returns isCreateNew() of the instance; false without one.
-    static bool isCreateNewNow() { return sInstance && sInstance->isCreateNew(); }
+    static bool isCreateNewNow() { return s_instance && s_instance->isCreateNew(); }
 
 private:
-    inline static IEditContext* sInstance = nullptr;
+    inline static IEditContext* s_instance = nullptr;
 };

@@ -20,9 +20,9 @@ public:
     virtual void changeTitlerFolderName(QString oldPath, QString newPath) = 0;
 
     // Returns the instance, which is not owned; null when nothing is reported. GUI thread.
-    static ITitlerFolderReporter* instance() { return sInstance; }
-    static void setInstance(ITitlerFolderReporter* reporter) { sInstance = reporter; }
+    static ITitlerFolderReporter* instance() { return s_instance; }
+    static void setInstance(ITitlerFolderReporter* reporter) { s_instance = reporter; }
 
 private:
-    inline static ITitlerFolderReporter* sInstance = nullptr;
+    inline static ITitlerFolderReporter* s_instance = nullptr;
 };

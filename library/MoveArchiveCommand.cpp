@@ -6,36 +6,36 @@
 
 MoveArchiveCommand::MoveArchiveCommand(ArchiveList* list, ArchiveItem* item, int source, int destination,
                                        QUndoCommand* parent)
-    : QUndoCommand(parent), mList(list), mItem(item), mSource(source), mDestination(destination)
+    : QUndoCommand(parent), m_list(list), m_item(item), m_source(source), m_destination(destination)
 {
 }
 
 void MoveArchiveCommand::redo()
 {
-    if (mSkipFirst)
-        mSkipFirst = false;
+    if (m_skipFirst)
+        m_skipFirst = false;
     else
-        moveTo(mDestination);
+        moveTo(m_destination);
 }
 
 void MoveArchiveCommand::undo()
 {
-    moveTo(mSource);
-    mList->slotMenuAboutToClose();
+    moveTo(m_source);
+    m_list->slotMenuAboutToClose();
 }
 
 void MoveArchiveCommand::moveTo(int position)
 {
-    if (!ArchiveItem::isUsable(mItem))
+    if (!ArchiveItem::isUsable(m_item))
         return;
-    mList->removeWidgetItem(mItem);
-    mList->addWidgetItem(mItem, position);
-    mList->saveArchiveListOrder();
+    m_list->removeWidgetItem(m_item);
+    m_list->addWidgetItem(m_item, position);
+    m_list->saveArchiveListOrder();
     if (ITitlerFolderReporter* reporter = ITitlerFolderReporter::instance())
-        reporter->updateTitlerOrder(mList->getCurrentPath());
+        reporter->updateTitlerOrder(m_list->getCurrentPath());
 }
 
 QList<ArchiveOrder*> MoveArchiveCommand::getArchiveOrderList() const
 {
-    return mList->getArchiveOrderList();
+    return m_list->getArchiveOrderList();
 }

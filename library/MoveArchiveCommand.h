@@ -25,9 +25,9 @@ public:
 private:
     void moveTo(int position);
 
-    ArchiveList* mList;
-    HeldArchiveItem mItem;
-    int mSource;
-    int mDestination;
-    bool mSkipFirst = true;
+    ArchiveList* m_list;
+    HeldArchiveItem m_item;
+    int m_source;
+    int m_destination;
+    bool m_skipFirst = true;
 };

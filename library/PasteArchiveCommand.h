@@ -20,9 +20,9 @@ public:
     void undo() override;
 
 private:
-    ArchiveList* mList;
-    HeldArchiveItem mItem;
-    int mOperationPosition;
-    int mSelectedPosition;
-    int mDoneOnce = 0;
+    ArchiveList* m_list;
+    HeldArchiveItem m_item;
+    int m_operationPosition;
+    int m_selectedPosition;
+    int m_doneOnce = 0;
 };

@@ -37,11 +37,11 @@ PictureThread::PictureThread(QObject* parent) : QThread(parent)
 PictureThread::~PictureThread()
 {
     {
-        QMutexLocker lock(&mMutex);
-        mUnfinished -= static_cast<int>(mJobs.size());
-        mJobs.clear();
-        mStop = true;
-        mCondition.wakeAll();
+        QMutexLocker lock(&m_mutex);
+        m_unfinished -= static_cast<int>(m_jobs.size());
+        m_jobs.clear();
+        m_stop = true;
+        m_condition.wakeAll();
     }
     wait();
 }
@@ -51,16 +51,16 @@ void PictureThread::addArchive(const Archive* archive, QList<QImage> images)
     if (!archive || images.size() < 2)
         return;
     Job job{std::make_unique<Archive>(*archive), images.at(0), images.at(1), hasTitle(*archive)};
-    QMutexLocker lock(&mMutex);
-    ++mUnfinished;
-    mJobs.push_back(std::move(job));
-    mCondition.wakeOne();
+    QMutexLocker lock(&m_mutex);
+    ++m_unfinished;
+    m_jobs.push_back(std::move(job));
+    m_condition.wakeOne();
 }
 
 void PictureThread::folderRenamed(const QString& before, const QString& after)
 {
-    QMutexLocker lock(&mMutex);
-    for (Job& job : mJobs)
+    QMutexLocker lock(&m_mutex);
+    for (Job& job : m_jobs)
         moveToFolder(*job.archive, before, after);
 }
 
@@ -73,7 +73,7 @@ void PictureThread::moveToFolder(Archive& archive, const QString& before, const 
 
 bool PictureThread::isThreadWaiting() const
 {
-    return mUnfinished == 0;
+    return m_unfinished == 0;
 }
 
 void PictureThread::run()
@@ -82,13 +82,13 @@ void PictureThread::run()
     for (;;) {
         Job job;
         {
-            QMutexLocker lock(&mMutex);
-            while (mJobs.empty() && !mStop)
-                mCondition.wait(&mMutex);
-            if (mStop)
+            QMutexLocker lock(&m_mutex);
+            while (m_jobs.empty() && !m_stop)
+                m_condition.wait(&m_mutex);
+            if (m_stop)
                 return;
-            job = std::move(mJobs.front());
-            mJobs.pop_front();
+            job = std::move(m_jobs.front());
+            m_jobs.pop_front();
         }
         saveArchiveThumnail(*job.archive, job.big, job.middle);
         // A deletion removes the title file first, then the pictures that exist at that time; those written
@@ -97,7 +97,7 @@ void PictureThread::run()
         if (job.hadTitle && !hasTitle(*job.archive))
             removePictures(*job.archive);
         job = Job(); // frees the images before the job counts as finished
-        --mUnfinished;
+        --m_unfinished;
     }
 }
 

@@ -37,7 +37,7 @@ public:
     bool isThreadWaiting() const;
 
     // Returns the number of jobs queued or being written. Any thread.
-    int unfinished() const { return mUnfinished; }
+    int unfinished() const { return m_unfinished; }
 
     // Redirects queued jobs for titles of a renamed folder to its new path. Any thread.
     void folderRenamed(const QString& before, const QString& after);
@@ -60,9 +60,9 @@ private:
     static bool hasTitle(const Archive& archive);
     static void removePictures(const Archive& archive);
 
-    QMutex mMutex; // guards the queue and the stop flag
-    QWaitCondition mCondition;
-    std::deque<Job> mJobs;
-    bool mStop = false;
-    std::atomic<int> mUnfinished{0};
+    QMutex m_mutex; // guards the queue and the stop flag
+    QWaitCondition m_condition;
+    std::deque<Job> m_jobs;
+    bool m_stop = false;
+    std::atomic<int> m_unfinished{0};
 };

@@ -13,10 +13,10 @@ SceneThread::SceneThread(QObject* parent) : QThread(parent)
 SceneThread::~SceneThread()
 {
     {
-        QMutexLocker lock(&mMutex);
-        mArchives.clear();
-        mStop = true;
-        mCondition.wakeAll();
+        QMutexLocker lock(&m_mutex);
+        m_archives.clear();
+        m_stop = true;
+        m_condition.wakeAll();
     }
     wait();
 }
@@ -26,9 +26,9 @@ void SceneThread::addArchive(const Archive* archive)
     if (!archive)
         return;
     auto copy = std::make_unique<Archive>(*archive);
-    QMutexLocker lock(&mMutex);
-    mArchives.push_back(std::move(copy));
-    mCondition.wakeOne();
+    QMutexLocker lock(&m_mutex);
+    m_archives.push_back(std::move(copy));
+    m_condition.wakeOne();
 }
 
 void SceneThread::run()
@@ -37,14 +37,14 @@ void SceneThread::run()
     for (;;) {
         std::unique_ptr<Archive> archive;
         {
-            QMutexLocker lock(&mMutex);
-            while (mArchives.empty() && !mStop)
-                mCondition.wait(&mMutex);
-            if (mStop)
+            QMutexLocker lock(&m_mutex);
+            while (m_archives.empty() && !m_stop)
+                m_condition.wait(&m_mutex);
+            if (m_stop)
                 return;
-            archive = std::move(mArchives.front());
-            mArchives.pop_front();
+            archive = std::move(m_archives.front());
+            m_archives.pop_front();
         }
-        mController.saveArchiveChange(QString::fromStdString(archive->getPath()), archive.get());
+        m_controller.saveArchiveChange(QString::fromStdString(archive->getPath()), archive.get());
     }
 }

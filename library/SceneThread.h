@@ -28,9 +28,9 @@ protected:
     void run() override;
 
 private:
-    CanvasController mController;
-    QMutex mMutex; // guards the queue and the stop flag
-    QWaitCondition mCondition;
-    std::deque<std::unique_ptr<Archive>> mArchives;
-    bool mStop = false;
+    CanvasController m_controller;
+    QMutex m_mutex; // guards the queue and the stop flag
+    QWaitCondition m_condition;
+    std::deque<std::unique_ptr<Archive>> m_archives;
+    bool m_stop = false;
 };

@@ -3,13 +3,13 @@
 #include "document/PictureReader.h"
 
 SmallPictures::SmallPictures(const QStringList& paths, QSize bounds)
-    : mBounds(bounds), mPictures(static_cast<std::size_t>(paths.size()))
+    : m_bounds(bounds), m_pictures(static_cast<std::size_t>(paths.size()))
 {
-    for (std::size_t i = 0; i < mPictures.size(); ++i)
-        mPictures[i].path = paths.at(static_cast<qsizetype>(i));
-    mWorker = std::async(std::launch::async, [this] {
-        for (Picture& picture : mPictures) {
-            if (mStop)
+    for (std::size_t i = 0; i < m_pictures.size(); ++i)
+        m_pictures[i].path = paths.at(static_cast<qsizetype>(i));
+    m_worker = std::async(std::launch::async, [this] {
+        for (Picture& picture : m_pictures) {
+            if (m_stop)
                 return;
             decode(picture);
         }
@@ -18,8 +18,8 @@ SmallPictures::SmallPictures(const QStringList& paths, QSize bounds)
 
 SmallPictures::~SmallPictures()
 {
-    mStop = true;
-    mWorker.wait();
+    m_stop = true;
+    m_worker.wait();
 }
 
 bool SmallPictures::decode(Picture& picture) const
@@ -27,7 +27,7 @@ bool SmallPictures::decode(Picture& picture) const
     State waiting = State::Waiting;
     if (!picture.state.compare_exchange_strong(waiting, State::Begun))
         return false;
-    picture.image = read(picture.path, mBounds);
+    picture.image = read(picture.path, m_bounds);
     picture.state = State::Decoded;
     picture.state.notify_all();
     return true;
@@ -35,9 +35,9 @@ bool SmallPictures::decode(Picture& picture) const
 
 QImage SmallPictures::take(qsizetype index)
 {
-    if (index < 0 || static_cast<std::size_t>(index) >= mPictures.size())
+    if (index < 0 || static_cast<std::size_t>(index) >= m_pictures.size())
         return {};
-    Picture& picture = mPictures[static_cast<std::size_t>(index)];
+    Picture& picture = m_pictures[static_cast<std::size_t>(index)];
     if (!decode(picture))
         picture.state.wait(State::Begun);
     return std::exchange(picture.image, {});

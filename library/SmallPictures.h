@@ -20,7 +20,7 @@ public:
     SmallPictures(const SmallPictures&) = delete;
     SmallPictures& operator=(const SmallPictures&) = delete;
 
-    qsizetype count() const { return static_cast<qsizetype>(mPictures.size()); }
+    qsizetype count() const { return static_cast<qsizetype>(m_pictures.size()); }
     // Returns the picture at the index, null when it cannot be read; each can be taken once. Decodes it here
     // if its decoding has not started.
     QImage take(qsizetype index);
@@ -43,8 +43,8 @@ private:
     // Decodes the picture. Returns false if another thread has already started that.
     bool decode(Picture& picture) const;
 
-    QSize mBounds;
-    std::vector<Picture> mPictures;
-    std::atomic<bool> mStop = false;
-    std::future<void> mWorker;
+    QSize m_bounds;
+    std::vector<Picture> m_pictures;
+    std::atomic<bool> m_stop = false;
+    std::future<void> m_worker;
 };

@@ -7,7 +7,7 @@
 #include <QPixmap>
 
 TemplateItem::TemplateItem(int index, bool isUser, QWidget* parent)
-    : TouchEventButton(parent), mIndex(index), mIsUser(isUser)
+    : TouchEventButton(parent), m_index(index), m_isUser(isUser)
 {
     setFixedSize(WIDGET_WIDTH, WIDGET_HEIGHT);
     setIconSize(TemplateThumbnail::SIZE);
@@ -17,8 +17,8 @@ TemplateItem::TemplateItem(int index, bool isUser, QWidget* parent)
 
 void TemplateItem::setImage(QString path)
 {
-    mImagePath = std::move(path);
-    mIsLoaded = false;
+    m_imagePath = std::move(path);
+    m_isLoaded = false;
     update();
 }
 
@@ -36,25 +36,25 @@ void TemplateItem::setSelectedStyle()
 void TemplateItem::clickTriggered()
 {
     setSelectedStyle();
-    Q_EMIT itemSelected(mIndex, this);
+    Q_EMIT itemSelected(m_index, this);
 }
 
 void TemplateItem::showMenu()
 {
-    if (!mIsUser)
+    if (!m_isUser)
         return;
-    if (!mMenu)
-        mMenu = new UserTemplateMenu(this);
-    mMenu->popup(mapToGlobal(rect().center()));
+    if (!m_menu)
+        m_menu = new UserTemplateMenu(this);
+    m_menu->popup(mapToGlobal(rect().center()));
 }
 
 void TemplateItem::paintEvent(QPaintEvent* event)
 {
-    if (!mIsLoaded) {
-        mIsLoaded = true;
+    if (!m_isLoaded) {
+        m_isLoaded = true;
         // The checker pattern is drawn into the picture, so that it has the picture's size, not that of the
         // item.
-        setIcon(QPixmap::fromImage(TemplateThumbnail::onChecker(TemplateThumbnail::read(mImagePath))));
+        setIcon(QPixmap::fromImage(TemplateThumbnail::onChecker(TemplateThumbnail::read(m_imagePath))));
     }
     TouchEventButton::paintEvent(event);
 }

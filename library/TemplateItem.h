@@ -19,9 +19,9 @@ public:
     // index: position in the picker's list of templates.
     TemplateItem(int index, bool isUser, QWidget* parent = nullptr);
 
-    int getIndex() const { return mIndex; }
-    void setIndex(int index) { mIndex = index; }
-    bool isUser() const { return mIsUser; }
+    int getIndex() const { return m_index; }
+    void setIndex(int index) { m_index = index; }
+    bool isUser() const { return m_isUser; }
 
     // Sets the path of a picture of 240 x 135 pixels; larger ones are scaled down. Only the checker pattern
     // is shown when there is no path, or when the picture cannot be read or is too large for a thumbnail.
@@ -41,9 +41,9 @@ protected:
     void paintEvent(QPaintEvent* event) override;
 
 private:
-    int mIndex;
-    bool mIsUser;
-    QString mImagePath;
-    bool mIsLoaded = false;
-    UserTemplateMenu* mMenu = nullptr; // a child of this item
+    int m_index;
+    bool m_isUser;
+    QString m_imagePath;
+    bool m_isLoaded = false;
+    UserTemplateMenu* m_menu = nullptr; // a child of this item
 };

@@ -87,9 +87,9 @@ void logNotFound(const std::wstring& text)
 
 TemplatePicker::TemplatePicker(QWidget* parent)
     : QDialog(parent, Qt::Dialog | Qt::FramelessWindowHint)
-    , mReloadRule(SystemSetupDef::emSystemLanguageUnknown, false)
-    , mSeparator(QStringLiteral(":/Separator_H"))
-    , mMasks(this, FRAME)
+    , m_reloadRule(SystemSetupDef::emSystemLanguageUnknown, false)
+    , m_separator(QStringLiteral(":/Separator_H"))
+    , m_masks(this, FRAME)
 {
     setObjectName(QStringLiteral("TemplateOverview"));
     setStyleSheet(QStringLiteral(" QWidget#TemplateOverview { background:transparent; }"));
@@ -97,8 +97,8 @@ TemplatePicker::TemplatePicker(QWidget* parent)
     new WindowPlaceKeeper(this); // owned by this dialog
     setAttribute(Qt::WA_AcceptTouchEvents);
     setFixedSize(SCREEN_SIZE);
-    mTitle = createLabel(this, QRect(TABS_LEFT, OUTER_MARGIN_HIGHT, TAB_AREA_WIDTH, LINE_RECT.top() - 9),
-                         "templatePickerTitle");
+    m_title = createLabel(this, QRect(TABS_LEFT, OUTER_MARGIN_HIGHT, TAB_AREA_WIDTH, LINE_RECT.top() - 9),
+                          "templatePickerTitle");
     createTabs();
     createPropertyArea();
     createButtons();
@@ -111,24 +111,24 @@ TemplatePicker::TemplatePicker(QWidget* parent)
 TemplatePicker::~TemplatePicker()
 {
     // Deleted first, since the tabs use the controllers.
-    delete mTabs;
+    delete m_tabs;
 }
 
 void TemplatePicker::createTabs()
 {
-    mTabs = new TitlerTabWidget(this);
-    mTabs->setGeometry(QRect(QPoint(TABS_LEFT, TABS_TOP), TAB_AREA_SIZE));
-    mTabs->setPainLine(PANE_LEFT, PANE_TOP);
-    mPresetTab = new TemplateTab(mController, false);
-    mUserTab = new TemplateTab(mUserController, true);
-    for (TemplateTab* tab : {mPresetTab, mUserTab}) {
-        mTabs->addTab(tab, QString());
+    m_tabs = new TitlerTabWidget(this);
+    m_tabs->setGeometry(QRect(QPoint(TABS_LEFT, TABS_TOP), TAB_AREA_SIZE));
+    m_tabs->setPainLine(PANE_LEFT, PANE_TOP);
+    m_presetTab = new TemplateTab(m_controller, false);
+    m_userTab = new TemplateTab(m_userController, true);
+    for (TemplateTab* tab : {m_presetTab, m_userTab}) {
+        m_tabs->addTab(tab, QString());
         connect(tab, &TemplateTab::itemSelected, this, &TemplatePicker::triggerSelected);
         connect(tab, &TemplateTab::itemPressed, this, &TemplatePicker::itemSelected);
         connect(tab, &TemplateTab::selectionChanged, this, &TemplatePicker::updateButtons);
     }
-    connect(mUserTab, &TemplateTab::selectionChanged, this, &TemplatePicker::updateUserTemplateArea);
-    connect(mTabs, &QTabWidget::currentChanged, this, &TemplatePicker::updateButtons);
+    connect(m_userTab, &TemplateTab::selectionChanged, this, &TemplatePicker::updateUserTemplateArea);
+    connect(m_tabs, &QTabWidget::currentChanged, this, &TemplatePicker::updateButtons);
 }
 
 QLabel* TemplatePicker::createLabel(QWidget* parent, const QRect& area, const char* name)
@@ -145,28 +145,28 @@ QLabel* TemplatePicker::createLabel(QWidget* parent, const QRect& area, const ch
 void TemplatePicker::createPropertyArea()
 {
     const QRect none;
-    mFileNameCaption = createLabel(mUserTab, none, "fileNameCaption");
-    mFileName = createLabel(mUserTab, none, "fileName");
-    mFileName->setStyleSheet(
+    m_fileNameCaption = createLabel(m_userTab, none, "fileNameCaption");
+    m_fileName = createLabel(m_userTab, none, "fileName");
+    m_fileName->setStyleSheet(
         QStringLiteral("background: rgb(38, 38, 38); color:rgb(178, 178, 178); padding: 0px 6px;"));
-    mTextCaption = createLabel(mUserTab, none, "textCaption");
-    mPreview = new ArchiveItem(&mPreviewArchive, ArchiveItem::NARROW_ITEM, mUserTab);
-    mPreview->initArchiveItemChildWidget();
-    mPreview->setFixedWidth(PROPERTY_AREA_PARTS_WIDTH); // same width as the box of the file name
-    mDeleteButton2 = createButton(mUserTab, QPoint(), "deleteTemplateButton");
-    connect(mDeleteButton2, &QPushButton::clicked, this, &TemplatePicker::deleteClicked2);
+    m_textCaption = createLabel(m_userTab, none, "textCaption");
+    m_preview = new ArchiveItem(&m_previewArchive, ArchiveItem::NARROW_ITEM, m_userTab);
+    m_preview->initArchiveItemChildWidget();
+    m_preview->setFixedWidth(PROPERTY_AREA_PARTS_WIDTH); // same width as the box of the file name
+    m_deleteButton2 = createButton(m_userTab, QPoint(), "deleteTemplateButton");
+    connect(m_deleteButton2, &QPushButton::clicked, this, &TemplatePicker::deleteClicked2);
 }
 
 void TemplatePicker::createButtons()
 {
     const int cancelLeft = TABS_LEFT + TAB_AREA_WIDTH - TOOLBARBTN_SIZE.width();
     const QPoint selectPos(cancelLeft - PAINS_SPACE - TOOLBARBTN_SIZE.width(), BUTTONS_TOP);
-    mSelectButton = createButton(this, selectPos, "selectPresetButton");
-    mSelectButton2 = createButton(this, selectPos, "selectUserButton");
-    mCancelButton = createButton(this, QPoint(cancelLeft, BUTTONS_TOP), "cancelTemplateButton");
-    connect(mSelectButton, &QPushButton::clicked, this, &TemplatePicker::selectClicked);
-    connect(mSelectButton2, &QPushButton::clicked, this, &TemplatePicker::selectClicked2);
-    connect(mCancelButton, &QPushButton::clicked, this, &TemplatePicker::cancelClicked);
+    m_selectButton = createButton(this, selectPos, "selectPresetButton");
+    m_selectButton2 = createButton(this, selectPos, "selectUserButton");
+    m_cancelButton = createButton(this, QPoint(cancelLeft, BUTTONS_TOP), "cancelTemplateButton");
+    connect(m_selectButton, &QPushButton::clicked, this, &TemplatePicker::selectClicked);
+    connect(m_selectButton2, &QPushButton::clicked, this, &TemplatePicker::selectClicked2);
+    connect(m_cancelButton, &QPushButton::clicked, this, &TemplatePicker::cancelClicked);
 }
 
 KSPushbutton* TemplatePicker::createButton(QWidget* parent, const QPoint& position, const char* name)
@@ -194,94 +194,94 @@ void TemplatePicker::buttonReleased(KSPushbutton* button)
 void TemplatePicker::setSystemLanFont(QFont font)
 {
     font.setPixelSize(TITLE_FONT_SIZE);
-    mTitle->setFont(font);
+    m_title->setFont(font);
     font.setPixelSize(FONT_SIZE);
     for (QWidget* widget :
-         std::initializer_list<QWidget*>{mTabs, mFileNameCaption, mFileName, mTextCaption, mSelectButton,
-                                         mSelectButton2, mDeleteButton2, mCancelButton})
+         std::initializer_list<QWidget*>{m_tabs, m_fileNameCaption, m_fileName, m_textCaption, m_selectButton,
+                                         m_selectButton2, m_deleteButton2, m_cancelButton})
         widget->setFont(font);
-    mPreview->updateRightChild();
+    m_preview->updateRightChild();
     updateUserTemplateArea();
 }
 
 void TemplatePicker::translateText()
 {
-    mTitle->setText(tr("Templates"));
-    mTabs->setTabText(0, tr("Preset"));
-    mTabs->setTabText(1, tr("User"));
-    mFileNameCaption->setText(tr("File Name"));
-    mTextCaption->setText(tr("Text"));
-    mSelectButton->setText(tr("Select"));
-    mSelectButton2->setText(tr("Select"));
-    mDeleteButton2->setText(tr("Delete"));
-    mCancelButton->setText(tr("Cancel"));
+    m_title->setText(tr("Templates"));
+    m_tabs->setTabText(0, tr("Preset"));
+    m_tabs->setTabText(1, tr("User"));
+    m_fileNameCaption->setText(tr("File Name"));
+    m_textCaption->setText(tr("Text"));
+    m_selectButton->setText(tr("Select"));
+    m_selectButton2->setText(tr("Select"));
+    m_deleteButton2->setText(tr("Delete"));
+    m_cancelButton->setText(tr("Cancel"));
 }
 
 void TemplatePicker::showEvent(QShowEvent* event)
 {
     QDialog::showEvent(event);
-    if (mFrame.isNull()) {
-        mFrame = DrawBoundingRectangle().paintBoundingRectangle(DIALOG_FRAME);
-        setMask(mFrame.mask()); // otherwise the corners are black without a compositor
+    if (m_frame.isNull()) {
+        m_frame = DrawBoundingRectangle().paintBoundingRectangle(DIALOG_FRAME);
+        setMask(m_frame.mask()); // otherwise the corners are black without a compositor
     }
     if (const QWidget* window = parentWidget())
         move(window->mapToGlobal(window->rect().center()) - rect().center());
-    for (TemplateTab* tab : {mPresetTab, mUserTab})
-        tab->scrollArea()->move(tab->mapFrom(mTabs, QPoint(PANE_LEFT + PAIN_LINE, PANE_TOP + PAIN_LINE)));
+    for (TemplateTab* tab : {m_presetTab, m_userTab})
+        tab->scrollArea()->move(tab->mapFrom(m_tabs, QPoint(PANE_LEFT + PAIN_LINE, PANE_TOP + PAIN_LINE)));
     const int width = PROPERTY_AREA_PARTS_WIDTH;
-    QPoint place = mUserTab->mapFrom(mTabs, QPoint(PROPERTY_LEFT, PANE_TOP));
-    for (QLabel* label : {mFileNameCaption, mFileName}) {
+    QPoint place = m_userTab->mapFrom(m_tabs, QPoint(PROPERTY_LEFT, PANE_TOP));
+    for (QLabel* label : {m_fileNameCaption, m_fileName}) {
         label->setGeometry(QRect(place, QSize(width, CAPTION_HEIGHT)));
         place.ry() += CAPTION_HEIGHT + PARTS_SPACE;
     }
-    mTextCaption->setGeometry(QRect(place, QSize(width, CAPTION_HEIGHT)));
-    mPreview->move(place + QPoint(0, CAPTION_HEIGHT + PARTS_SPACE));
+    m_textCaption->setGeometry(QRect(place, QSize(width, CAPTION_HEIGHT)));
+    m_preview->move(place + QPoint(0, CAPTION_HEIGHT + PARTS_SPACE));
     const int bottom =
-        mPresetTab->mapFrom(mTabs, QPoint(0, PANE_TOP + SCROLL_AREA_HIGHT + 2 * PAIN_LINE)).y();
-    mDeleteButton2->move(place.x() + (width - TOOLBARBTN_SIZE.width()) / 2,
-                         bottom - TOOLBARBTN_SIZE.height());
+        m_presetTab->mapFrom(m_tabs, QPoint(0, PANE_TOP + SCROLL_AREA_HIGHT + 2 * PAIN_LINE)).y();
+    m_deleteButton2->move(place.x() + (width - TOOLBARBTN_SIZE.width()) / 2,
+                          bottom - TOOLBARBTN_SIZE.height());
     updateUserTemplateArea(); // elides the name to the width it has now
 }
 
 void TemplatePicker::updateFilenameArea(const QString& name)
 {
-    const int room = mFileName->contentsRect().width() - 12;
-    const QFontMetrics metrics(mFileName->font());
-    mFileName->setText(metrics.horizontalAdvance(name) > room ? metrics.elidedText(name, Qt::ElideRight, room)
-                                                              : name);
+    const int room = m_fileName->contentsRect().width() - 12;
+    const QFontMetrics metrics(m_fileName->font());
+    m_fileName->setText(
+        metrics.horizontalAdvance(name) > room ? metrics.elidedText(name, Qt::ElideRight, room) : name);
 }
 
 void TemplatePicker::paintEvent(QPaintEvent* event)
 {
     QDialog::paintEvent(event);
     QPainter painter(this);
-    painter.drawPixmap(OUTSIDE_BORDER_STARTPOINT, mFrame);
+    painter.drawPixmap(OUTSIDE_BORDER_STARTPOINT, m_frame);
     drawHorizontalLine(painter);
 }
 
 void TemplatePicker::drawHorizontalLine(QPainter& painter)
 {
-    painter.drawImage(LINE_RECT, mSeparator);
-    painter.drawImage(BTMLINE_RECT, mSeparator);
+    painter.drawImage(LINE_RECT, m_separator);
+    painter.drawImage(BTMLINE_RECT, m_separator);
 }
 
 // --- What the operator and the file manager do with templates ----------------------------------------------
 
 void TemplatePicker::initImageView()
 {
-    mPresetTab->setTemplates(mController.getTemplates(mReloadRule.language(), mPin));
+    m_presetTab->setTemplates(m_controller.getTemplates(m_reloadRule.language(), m_pin));
 }
 
 void TemplatePicker::initImageView2()
 {
-    mUserTab->setTemplates(mUserController.getTemplates());
+    m_userTab->setTemplates(m_userController.getTemplates());
 }
 
 void TemplatePicker::reloadTemplates(SystemSetupDef::emSystemLanguageType language)
 {
-    if (!mReloadRule.needsReload(language, mPin))
+    if (!m_reloadRule.needsReload(language, m_pin))
         return;
-    mReloadRule.reloaded(language, mPin);
+    m_reloadRule.reloaded(language, m_pin);
     initImageView();
 }
 
@@ -292,13 +292,13 @@ void TemplatePicker::reloadTemplates2()
 
 void TemplatePicker::showUserTemplateTab()
 {
-    mTabs->setCurrentIndex(1);
-    mUserTab->scrollToEnd();
+    m_tabs->setCurrentIndex(1);
+    m_userTab->scrollToEnd();
 }
 
 TemplateItem* TemplatePicker::addNewTemplateToLast(Archive* archive)
 {
-    return mUserTab->addNewTemplateToLast(archive);
+    return m_userTab->addNewTemplateToLast(archive);
 }
 
 void TemplatePicker::itemSelected(QPushButton* button)
@@ -310,30 +310,30 @@ void TemplatePicker::itemSelected(QPushButton* button)
 void TemplatePicker::triggerSelected(int index, TemplateItem* item)
 {
     LOG_USER_OPERATE(L"Template Area", 200, L"Select the " + std::to_wstring(index) + L" thumnail");
-    (item->isUser() ? mUserTab : mPresetTab)->select(item);
+    (item->isUser() ? m_userTab : m_presetTab)->select(item);
 }
 
 void TemplatePicker::updateButtons()
 {
-    const bool isUserTab = mTabs->currentIndex() == 1;
-    mSelectButton->setVisible(!isUserTab);
-    mSelectButton2->setVisible(isUserTab);
-    mSelectButton->setEnabled(mPresetTab->selectedItem() != nullptr);
-    mSelectButton2->setEnabled(mUserTab->selectedItem() != nullptr);
-    mDeleteButton2->setEnabled(mUserTab->selectedItem() != nullptr);
+    const bool isUserTab = m_tabs->currentIndex() == 1;
+    m_selectButton->setVisible(!isUserTab);
+    m_selectButton2->setVisible(isUserTab);
+    m_selectButton->setEnabled(m_presetTab->selectedItem() != nullptr);
+    m_selectButton2->setEnabled(m_userTab->selectedItem() != nullptr);
+    m_deleteButton2->setEnabled(m_userTab->selectedItem() != nullptr);
 }
 
 void TemplatePicker::updateUserTemplateArea()
 {
-    const Archive* archive = mUserTab->selectedArchive();
+    const Archive* archive = m_userTab->selectedArchive();
     updateTextObjectArea(archive ? *archive : Archive());
     updateFilenameArea(archive ? TemplateTab::templateName(*archive) : QString());
 }
 
 void TemplatePicker::updateTextObjectArea(const Archive& archive)
 {
-    mPreviewArchive = archive;
-    mPreview->updateRightChild();
+    m_previewArchive = archive;
+    m_preview->updateRightChild();
 }
 
 void TemplatePicker::cancelClicked()
@@ -344,12 +344,12 @@ void TemplatePicker::cancelClicked()
 
 void TemplatePicker::selectClicked()
 {
-    take(*mPresetTab);
+    take(*m_presetTab);
 }
 
 void TemplatePicker::selectClicked2()
 {
-    take(*mUserTab);
+    take(*m_userTab);
 }
 
 void TemplatePicker::take(TemplateTab& tab)
@@ -357,7 +357,7 @@ void TemplatePicker::take(TemplateTab& tab)
     Archive* archive = tab.selectedArchive();
     if (!archive)
         return;
-    mSelectedItem = true;
+    m_selectedItem = true;
     Q_EMIT selectedTemplate(archive);
     accept();
 }
@@ -365,11 +365,11 @@ void TemplatePicker::take(TemplateTab& tab)
 void TemplatePicker::deleteClicked2()
 {
     Q_EMIT signalCloseSoftwareKeyBoardForFileManager();
-    const Archive* archive = mUserTab->selectedArchive();
+    const Archive* archive = m_userTab->selectedArchive();
     MessageBoxController* messages = MessageBoxController::getInstance();
     if (!archive || !messages)
         return;
-    mAskedItem = mUserTab->selectedItem();
+    m_askedItem = m_userTab->selectedItem();
     connect(messages, &MessageBoxController::signalCloseMessage, this,
             &TemplatePicker::slotDeleteCloseMessage, Qt::UniqueConnection);
     messages->postMessage(MessageDef::MESSAGE_DELETE_TEMPLATE, TemplateTab::templateName(*archive));
@@ -382,65 +382,65 @@ void TemplatePicker::slotDeleteCloseMessage(MessageDefine::tagCloseParam param)
     if (MessageBoxController* messages = MessageBoxController::getInstance())
         disconnect(messages, &MessageBoxController::signalCloseMessage, this,
                    &TemplatePicker::slotDeleteCloseMessage);
-    const bool isAsked = mAskedItem && mAskedItem == mUserTab->selectedItem();
-    mAskedItem.clear();
+    const bool isAsked = m_askedItem && m_askedItem == m_userTab->selectedItem();
+    m_askedItem.clear();
     if (param.closeType != MessageDefine::CLOSE_OK || !isAsked)
         return;
     const int id = deleteUserTemplate();
     if (id != -1)
-        mUserTab->removeTemplate(id);
+        m_userTab->removeTemplate(id);
 }
 
 int TemplatePicker::deleteUserTemplate()
 {
-    const Archive* archive = mUserTab->selectedArchive();
-    if (!archive || mUserController.deleteTemplate(archive->getPath()) == 0)
+    const Archive* archive = m_userTab->selectedArchive();
+    if (!archive || m_userController.deleteTemplate(archive->getPath()) == 0)
         return -1;
-    return mUserTab->selectedItem()->getIndex();
+    return m_userTab->selectedItem()->getIndex();
 }
 
 void TemplatePicker::overrideTemplate(int id)
 {
-    mUserTab->removeTemplate(id);
+    m_userTab->removeTemplate(id);
 }
 
 int TemplatePicker::findTemplateIdFromName(const QString& name) const
 {
-    return mUserTab->findTemplateIdFromName(name);
+    return m_userTab->findTemplateIdFromName(name);
 }
 
 void TemplatePicker::slotSaveAsTemplate(QString name)
 {
     auto archive = std::make_unique<Archive>();
-    const bool isRead = mUserController.loadTemplate(name.toStdString(), archive.get()) != 0;
-    mUserController.addNewTemplateToLastInOrderXml(name.toStdString());
+    const bool isRead = m_userController.loadTemplate(name.toStdString(), archive.get()) != 0;
+    m_userController.addNewTemplateToLastInOrderXml(name.toStdString());
     TemplateItem* item = addNewTemplateToLast(archive.release());
     if (isRead)
-        mUserTab->select(item); // the picker scrolls to the selected item
+        m_userTab->select(item); // the picker scrolls to the selected item
 }
 
 void TemplatePicker::slotImportNewUserTemplate(QString name)
 {
-    if (!mUserController.isTemplatePath(name)) {
+    if (!m_userController.isTemplatePath(name)) {
         ConfinedPath::logRefusal(L"a new template is said to be in: ", name.toStdString());
         return;
     }
     if (name.contains(QLatin1Char('/')))
-        name = QFileInfo(name).isDir() ? lastPartOf(name) : templateNameIn(*mUserTab, name);
+        name = QFileInfo(name).isDir() ? lastPartOf(name) : templateNameIn(*m_userTab, name);
     const int id = findTemplateIdFromName(name);
     if (id != -1)
         overrideTemplate(id);
     auto archive = std::make_unique<Archive>();
-    const int result = mUserController.createNewTemplateXml(name.toStdString(), archive.get());
+    const int result = m_userController.createNewTemplateXml(name.toStdString(), archive.get());
     if (result < 0)
         ListMessages::post(MessageDef::MESSAGE_DISK_FULL_ON_TEMPLATE, name);
     if (result < 1) {
         // The folder does not exist or the disk is full, so the template is not offered. A previous template
         // of this name does not exist any more either.
-        mUserController.removeFromOrderXml(name.toStdString());
+        m_userController.removeFromOrderXml(name.toStdString());
         return;
     }
-    mUserController.addNewTemplateToLastInOrderXml(name.toStdString());
+    m_userController.addNewTemplateToLastInOrderXml(name.toStdString());
     addNewTemplateToLast(archive.release());
 }
 
@@ -456,31 +456,31 @@ void TemplatePicker::slotRenameUserTemplate(QString oldName, QString newName, QS
         return;
     }
     const QString folder = lastPartOf(path) == newName ? QDir::cleanPath(path) : folderOf(path);
-    if (!mUserController.isTemplatePath(folder)) {
+    if (!m_userController.isTemplatePath(folder)) {
         ConfinedPath::logRefusal(L"a template is said to be in: ", path.toStdString());
         return;
     }
-    Archive* archive = mUserTab->archive(id);
+    Archive* archive = m_userTab->archive(id);
     archive->setName((newName + QStringLiteral("/Titler")).toStdString());
     archive->setPath((folder + QStringLiteral("/Titler.xml")).toStdString());
-    TemplateItem* item = mUserTab->item(id);
+    TemplateItem* item = m_userTab->item(id);
     item->setImage(archive->getFullPathOfThumbnailSmall());
-    if (item == mUserTab->selectedItem()) {
+    if (item == m_userTab->selectedItem()) {
         updateFilenameArea(newName);
-        mUserTab->saveSelection();
+        m_userTab->saveSelection();
     }
-    mUserController.renameInOrderXml(oldName.toStdString(), newName.toStdString());
+    m_userController.renameInOrderXml(oldName.toStdString(), newName.toStdString());
 }
 
 void TemplatePicker::slotDeleteUserTemplate(QString path)
 {
-    const QString name = templateNameIn(*mUserTab, path);
-    const int id = mUserController.isTemplatePath(path) ? findTemplateIdFromName(name) : -1;
+    const QString name = templateNameIn(*m_userTab, path);
+    const int id = m_userController.isTemplatePath(path) ? findTemplateIdFromName(name) : -1;
     if (id == -1) {
         logNotFound(L"slotDeleteUserTemplate() \"" + name.toStdWString() + L"(" + path.toStdWString() +
                     L")\" is not found.");
         return;
     }
     overrideTemplate(id);
-    mUserController.reCreateNewOrderXml();
+    m_userController.reCreateNewOrderXml();
 }

@@ -71,18 +71,18 @@ public:
     TemplateItem* addNewTemplateToLast(Archive* archive);
 
     // Returns whether a template was picked since setSelectedItem(false).
-    bool isSelectedItem() const { return mSelectedItem; }
-    void setSelectedItem(bool selected) { mSelectedItem = selected; }
+    bool isSelectedItem() const { return m_selectedItem; }
+    void setSelectedItem(bool selected) { m_selectedItem = selected; }
 
-    void setModuleInfo(SystemSetupDef::emInformationModel module) { mModule = module; }
+    void setModuleInfo(SystemSetupDef::emInformationModel module) { m_module = module; }
     void setSystemLanFont(QFont font);
     void translateText();
 
-    void showDialogMaskWidget(bool show) { mMasks.showDialogMaskWidget(show); }
-    void showMessageMaskWidget(bool show) { mMasks.showMessageMaskWidget(show); }
+    void showDialogMaskWidget(bool show) { m_masks.showDialogMaskWidget(show); }
+    void showMessageMaskWidget(bool show) { m_masks.showMessageMaskWidget(show); }
 
-    TemplateTab* presetTab() const { return mPresetTab; }
-    TemplateTab* userTab() const { return mUserTab; }
+    TemplateTab* presetTab() const { return m_presetTab; }
+    TemplateTab* userTab() const { return m_userTab; }
 
 Q_SIGNALS:
     // Emitted when a template was picked. The picker owns the record, which is valid during the call.
@@ -131,29 +131,29 @@ private:
     void updateFilenameArea(const QString& name);
     void drawHorizontalLine(QPainter& painter);
 
-    TemplatePickerController mController;
-    UserTemplatePickerController mUserController;
-    TemplateReloadRule mReloadRule;
-    bool mPin = false; // use the Chinese presets for every language
-    SystemSetupDef::emInformationModel mModule = SystemSetupDef::emInformationModelDefault;
-    bool mSelectedItem = false;
+    TemplatePickerController m_controller;
+    UserTemplatePickerController m_userController;
+    TemplateReloadRule m_reloadRule;
+    bool m_pin = false; // use the Chinese presets for every language
+    SystemSetupDef::emInformationModel m_module = SystemSetupDef::emInformationModelDefault;
+    bool m_selectedItem = false;
     // The template of the question being shown. The answer is ignored when another one is selected by then.
-    QPointer<TemplateItem> mAskedItem;
+    QPointer<TemplateItem> m_askedItem;
 
-    TitlerTabWidget* mTabs = nullptr;
-    TemplateTab* mPresetTab = nullptr;
-    TemplateTab* mUserTab = nullptr;
-    QLabel* mTitle = nullptr;
-    QLabel* mFileNameCaption = nullptr;
-    QLabel* mFileName = nullptr;
-    QLabel* mTextCaption = nullptr;
-    ArchiveItem* mPreview = nullptr;
-    Archive mPreviewArchive;
-    KSPushbutton* mSelectButton = nullptr;
-    KSPushbutton* mSelectButton2 = nullptr;
-    KSPushbutton* mDeleteButton2 = nullptr;
-    KSPushbutton* mCancelButton = nullptr;
-    QPixmap mFrame;
-    QImage mSeparator;
-    DialogMasks mMasks;
+    TitlerTabWidget* m_tabs = nullptr;
+    TemplateTab* m_presetTab = nullptr;
+    TemplateTab* m_userTab = nullptr;
+    QLabel* m_title = nullptr;
+    QLabel* m_fileNameCaption = nullptr;
+    QLabel* m_fileName = nullptr;
+    QLabel* m_textCaption = nullptr;
+    ArchiveItem* m_preview = nullptr;
+    Archive m_previewArchive;
+    KSPushbutton* m_selectButton = nullptr;
+    KSPushbutton* m_selectButton2 = nullptr;
+    KSPushbutton* m_deleteButton2 = nullptr;
+    KSPushbutton* m_cancelButton = nullptr;
+    QPixmap m_frame;
+    QImage m_separator;
+    DialogMasks m_masks;
 };

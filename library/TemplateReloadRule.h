@@ -9,27 +9,27 @@ class TemplateReloadRule
 public:
     // language and pin are those of the set that is shown now.
     TemplateReloadRule(SystemSetupDef::emSystemLanguageType language, bool pin)
-        : mLanguage(language), mLastPin(pin)
+        : m_language(language), m_lastPin(pin)
     {
     }
 
     bool needsReload(SystemSetupDef::emSystemLanguageType language, bool pin) const
     {
-        if (language == mLanguage)
-            return pin && mLastPin != pin;
-        return pin != mLastPin || !pin;
+        if (language == m_language)
+            return pin && m_lastPin != pin;
+        return pin != m_lastPin || !pin;
     }
 
     // Call after each reload.
     void reloaded(SystemSetupDef::emSystemLanguageType language, bool pin)
     {
-        mLanguage = language;
-        mLastPin = pin;
+        m_language = language;
+        m_lastPin = pin;
     }
 
-    SystemSetupDef::emSystemLanguageType language() const { return mLanguage; }
+    SystemSetupDef::emSystemLanguageType language() const { return m_language; }
 
 private:
-    SystemSetupDef::emSystemLanguageType mLanguage;
-    bool mLastPin;
+    SystemSetupDef::emSystemLanguageType m_language;
+    bool m_lastPin;
 };

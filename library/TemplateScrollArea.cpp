@@ -31,8 +31,8 @@ TemplateScrollArea::TemplateScrollArea(QWidget* parent) : QScrollArea(parent)
     verticalScrollBar()->setStyleSheet(QString::fromLatin1(SCROLL_BAR_STYLE));
     setHorizontalScrollBarPolicy(Qt::ScrollBarAlwaysOff);
     setFocusPolicy(Qt::NoFocus);
-    connect(&mFinger, &OneFinger::cancelled, this, &TemplateScrollArea::rest);
-    connect(&mFlicker, &Flicker::ticked, this, &TemplateScrollArea::getDistance);
+    connect(&m_finger, &OneFinger::cancelled, this, &TemplateScrollArea::rest);
+    connect(&m_flicker, &Flicker::ticked, this, &TemplateScrollArea::getDistance);
 }
 
 void TemplateScrollArea::initTouch()
@@ -46,14 +46,14 @@ void TemplateScrollArea::initTouch()
 // Drops the pressed button and stops the motion. Called when the touch was cancelled.
 void TemplateScrollArea::rest()
 {
-    mFlicker.cancel();
-    mPressedButton.clear();
+    m_flicker.cancel();
+    m_pressedButton.clear();
 }
 
 void TemplateScrollArea::letGoOf(TouchEventButton* button)
 {
-    if (mFinger.receiver() == button)
-        mFinger.cancel();
+    if (m_finger.receiver() == button)
+        m_finger.cancel();
 }
 
 bool TemplateScrollArea::event(QEvent* event)
@@ -84,48 +84,48 @@ bool TemplateScrollArea::eventFilter(QObject* watched, QEvent* event)
 
 bool TemplateScrollArea::handleTouch(QObject* watched, QTouchEvent* event)
 {
-    const bool wasFlicking = mFlicker.isGliding();
-    if (mFinger.follow(event, watched) == OneFinger::Step::None)
+    const bool wasFlicking = m_flicker.isGliding();
+    if (m_finger.follow(event, watched) == OneFinger::Step::None)
         return true;
     onTouchEvent();
     if (!wasFlicking)
         onTranslateTouchEventToMouse(watched);
-    if (!mFinger.isDown())
-        mPressedButton.clear();
+    if (!m_finger.isDown())
+        m_pressedButton.clear();
     return true;
 }
 
 void TemplateScrollArea::onTouchEvent()
 {
-    const QPoint position = mFinger.positionIn(this).toPoint();
-    if (mFinger.step() == OneFinger::Step::Begin) {
-        mFlicker.begin(position);
-        mPressedButton.clear();
+    const QPoint position = m_finger.positionIn(this).toPoint();
+    if (m_finger.step() == OneFinger::Step::Begin) {
+        m_flicker.begin(position);
+        m_pressedButton.clear();
     } else if (!rect().contains(position)) {
         return;
-    } else if (mFinger.step() == OneFinger::Step::Move) {
-        mFlicker.follow(position);
+    } else if (m_finger.step() == OneFinger::Step::Move) {
+        m_flicker.follow(position);
     } else {
-        mFlicker.lift(position);
+        m_flicker.lift(position);
     }
 }
 
 void TemplateScrollArea::onTranslateTouchEventToMouse(QObject* watched)
 {
-    if (mFinger.step() == OneFinger::Step::Begin) {
-        mPressPoint = mFinger.position().toPoint();
-        mMoved = false;
-        mPressedButton = qobject_cast<QPushButton*>(watched);
-        sendPressToViewport(mPressPoint);
+    if (m_finger.step() == OneFinger::Step::Begin) {
+        m_pressPoint = m_finger.position().toPoint();
+        m_moved = false;
+        m_pressedButton = qobject_cast<QPushButton*>(watched);
+        sendPressToViewport(m_pressPoint);
         return;
     }
-    if (FlickMotion::isBeyondSlop(mPressPoint, mFinger.position(), FlickMotion::TOUCH_SLOP))
-        mMoved = true;
-    if (mFinger.step() != OneFinger::Step::End)
+    if (FlickMotion::isBeyondSlop(m_pressPoint, m_finger.position(), FlickMotion::TOUCH_SLOP))
+        m_moved = true;
+    if (m_finger.step() != OneFinger::Step::End)
         return;
     viewport()->releaseMouse();
-    if (mPressedButton && !mMoved)
-        Q_EMIT itemPressed(mPressedButton);
+    if (m_pressedButton && !m_moved)
+        Q_EMIT itemPressed(m_pressedButton);
 }
 
 void TemplateScrollArea::sendPressToViewport(const QPoint& global)
@@ -138,7 +138,7 @@ void TemplateScrollArea::sendPressToViewport(const QPoint& global)
 // Scrolls by half of the distance that is left. Called for each step of the motion.
 void TemplateScrollArea::getDistance()
 {
-    changeScrollBarValue(FlickMotion::pixels(mFlicker.advance()).y());
+    changeScrollBarValue(FlickMotion::pixels(m_flicker.advance()).y());
 }
 
 void TemplateScrollArea::changeScrollBarValue(int distance)

@@ -29,9 +29,9 @@ public:
 
     // Enables touch events. Call when viewport and scroll bar exist.
     void initTouch();
-    void stopFlick() { mFlicker.stop(); }
+    void stopFlick() { m_flicker.stop(); }
     // Returns whether the content has caught up with the finger.
-    bool isFlickEnd() const { return mFlicker.isEnd(); }
+    bool isFlickEnd() const { return m_flicker.isEnd(); }
     // Call before a button is removed from the grid: cancels a touch on it.
     void letGoOf(TouchEventButton* button);
 
@@ -54,9 +54,9 @@ private:
     void rest();
     void sendPressToViewport(const QPoint& global);
 
-    OneFinger mFinger{this};
-    Flicker mFlicker{this, FlickMotion::templateGrid()}; // in coordinates of this widget
-    QPoint mPressPoint;                                  // global coordinates
-    bool mMoved = false;
-    QPointer<QPushButton> mPressedButton;
+    OneFinger m_finger{this};
+    Flicker m_flicker{this, FlickMotion::templateGrid()}; // in coordinates of this widget
+    QPoint m_pressPoint;                                  // global coordinates
+    bool m_moved = false;
+    QPointer<QPushButton> m_pressedButton;
 };

@@ -31,7 +31,7 @@ public:
     TemplateTab(ITemplateSource& source, bool isUser, QWidget* parent = nullptr);
     ~TemplateTab() override;
 
-    bool isUser() const { return mIsUser; }
+    bool isUser() const { return m_isUser; }
 
     // Replaces all templates and selects the one that the source reports as the last one selected. Takes
     // ownership of the records; those without a name are not templates and are deleted.
@@ -43,7 +43,7 @@ public:
     // Deletes the item and the record, and closes the gap. Ignores an index out of range.
     void removeTemplate(int id);
 
-    int count() const { return static_cast<int>(mArchives.size()); }
+    int count() const { return static_cast<int>(m_archives.size()); }
     TemplateItem* item(int id) const; // null for an index out of range; also holds for the record
     Archive* archive(int id) const;
 
@@ -55,14 +55,14 @@ public:
 
     // Selects the item and stores it as the last one; null clears the selection and stores nothing.
     void select(TemplateItem* item);
-    TemplateItem* selectedItem() const { return mSelected; }
+    TemplateItem* selectedItem() const { return m_selected; }
     Archive* selectedArchive() const; // null without a selection; owned by the tab
     // Stores the path of the selected template again.
     void saveSelection();
 
     // Scrolls to the last row, now or after the grid has been laid out.
     void scrollToEnd();
-    TemplateScrollArea* scrollArea() const { return mScrollArea; }
+    TemplateScrollArea* scrollArea() const { return m_scrollArea; }
 
 Q_SIGNALS:
     // Emitted when an item was selected by touch or mouse.
@@ -79,12 +79,12 @@ private:
     void place(TemplateItem* item);
     void clear();
 
-    ITemplateSource& mSource;
-    bool mIsUser;
-    TemplateScrollArea* mScrollArea;
-    QWidget* mBoard; // parent of the items
-    QGridLayout* mGrid;
-    std::vector<std::unique_ptr<Archive>> mArchives;
-    QList<TemplateItem*> mItems; // same indices as the templates; owned by the board
-    TemplateItem* mSelected = nullptr;
+    ITemplateSource& m_source;
+    bool m_isUser;
+    TemplateScrollArea* m_scrollArea;
+    QWidget* m_board; // parent of the items
+    QGridLayout* m_grid;
+    std::vector<std::unique_ptr<Archive>> m_archives;
+    QList<TemplateItem*> m_items; // same indices as the templates; owned by the board
+    TemplateItem* m_selected = nullptr;
 };

@@ -70,16 +70,16 @@ QImage renderScene(QGraphicsScene& scene, QSize size)
 
 ThumbnailRender::ThumbnailRender(QObject* parent) : IThumbnailRender(parent)
 {
-    mMiddleScene.setSceneRect(SCENE_RECT_SIZE);
-    mBigScene.setSceneRect(BIG_SIZE_SCENE_RECT_SIZE);
+    m_middleScene.setSceneRect(SCENE_RECT_SIZE);
+    m_bigScene.setSceneRect(BIG_SIZE_SCENE_RECT_SIZE);
     // Each scene is filled, rendered once and cleared, so an index would not pay off.
-    mMiddleScene.setItemIndexMethod(QGraphicsScene::NoIndex);
-    mBigScene.setItemIndexMethod(QGraphicsScene::NoIndex);
+    m_middleScene.setItemIndexMethod(QGraphicsScene::NoIndex);
+    m_bigScene.setItemIndexMethod(QGraphicsScene::NoIndex);
 }
 
 ThumbnailRender::~ThumbnailRender()
 {
-    mBigPictures.clear(); // each job waits for its decoder
+    m_bigPictures.clear(); // each job waits for its decoder
     clearMiddleSizeCanvasScene();
     clearBigSizeCanvasScene();
 }
@@ -96,21 +96,21 @@ void ThumbnailRender::makeThumbnail(const Archive* archive, bool bigSize)
 
 bool ThumbnailRender::makePictureThreadIsFinished()
 {
-    while (!mBigPictures.empty())
+    while (!m_bigPictures.empty())
         drawNextBigPicture();
-    return mPictureThread.isThreadWaiting();
+    return m_pictureThread.isThreadWaiting();
 }
 
 int ThumbnailRender::unfinishedTitles()
 {
-    return static_cast<int>(mBigPictures.size()) + mPictureThread.unfinished();
+    return static_cast<int>(m_bigPictures.size()) + m_pictureThread.unfinished();
 }
 
 void ThumbnailRender::folderRenamed(const QString& before, const QString& after)
 {
-    for (const std::unique_ptr<BigPicture>& job : mBigPictures)
+    for (const std::unique_ptr<BigPicture>& job : m_bigPictures)
         PictureThread::moveToFolder(*job->archive, before, after);
-    mPictureThread.folderRenamed(before, after);
+    m_pictureThread.folderRenamed(before, after);
 }
 
 void ThumbnailRender::makeMiddleAndSmallSizeThumbnail(const Archive& archive)
@@ -124,14 +124,14 @@ void ThumbnailRender::createMiddleSizeCanvasSceneUsingArchiveData(const Archive&
 {
     const QString background = archive.getFullPathOfBgResource();
     if (!background.isEmpty()) {
-        mMiddleBackground = new GraphicsPixmap(background);
-        const QPixmap pixmap = mMiddleBackground->pixmap();
+        m_middleBackground = new GraphicsPixmap(background);
+        const QPixmap pixmap = m_middleBackground->pixmap();
         if (!pixmap.isNull())
-            mMiddleBackground->setPixmap(
+            m_middleBackground->setPixmap(
                 pixmap.scaled(THUMBNAIL_MID_SIZE, Qt::IgnoreAspectRatio, Qt::SmoothTransformation));
-        mMiddleScene.addItem(mMiddleBackground);
-        mMiddleBackground->setPos(archive.getBgPointX(), archive.getBgPointY());
-        mMiddleBackground->setZValue(archive.getBgPointZ());
+        m_middleScene.addItem(m_middleBackground);
+        m_middleBackground->setPos(archive.getBgPointX(), archive.getBgPointY());
+        m_middleBackground->setZValue(archive.getBgPointZ());
     }
     for (TText* record : archive.text()) {
         auto* text = new GraphicsText(record, record->getTextObjectID());
@@ -141,15 +141,15 @@ void ThumbnailRender::createMiddleSizeCanvasSceneUsingArchiveData(const Archive&
         text->initShowText();
         if (auto* shadow = qobject_cast<QGraphicsDropShadowEffect*>(text->graphicsEffect()))
             shadow->setColor(DROP_SHADOW_COLOR);
-        mMiddleScene.addItem(text);
+        m_middleScene.addItem(text);
         logBoundingRect(*text, record->getTextObjectID());
     }
-    limitTextsToRaster(mMiddleScene);
+    limitTextsToRaster(m_middleScene);
 }
 
 QImage ThumbnailRender::renderMiddleSizeCanvasScene()
 {
-    return renderScene(mMiddleScene, THUMBNAIL_MID_SIZE);
+    return renderScene(m_middleScene, THUMBNAIL_MID_SIZE);
 }
 
 void ThumbnailRender::saveMiddleSizeThumnail(const Archive& archive, const QImage& image)
@@ -161,8 +161,8 @@ void ThumbnailRender::saveMiddleSizeThumnail(const Archive& archive, const QImag
 
 void ThumbnailRender::clearMiddleSizeCanvasScene()
 {
-    mMiddleScene.clear();
-    mMiddleBackground = nullptr;
+    m_middleScene.clear();
+    m_middleBackground = nullptr;
     clearMiddleSizeCanvasSceneResource();
 }
 
@@ -184,24 +184,24 @@ void ThumbnailRender::makeBigSizeThumbnail(const Archive& archive)
             announce();
         });
     }
-    mBigPictures.push_back(std::move(job));
+    m_bigPictures.push_back(std::move(job));
 }
 
 // Draws the next picture whose background is decoded. Decoding 1920x1080 takes at least as long as drawing
 // the texts, so it is done in another thread.
 void ThumbnailRender::drawDecodedBigPictures()
 {
-    if (!mBigPictures.empty() && mBigPictures.front()->isDecoded)
+    if (!m_bigPictures.empty() && m_bigPictures.front()->isDecoded)
         drawNextBigPicture();
     // Draws only one picture per event.
-    if (!mBigPictures.empty() && mBigPictures.front()->isDecoded)
+    if (!m_bigPictures.empty() && m_bigPictures.front()->isDecoded)
         QMetaObject::invokeMethod(this, &ThumbnailRender::drawDecodedBigPictures, Qt::QueuedConnection);
 }
 
 void ThumbnailRender::drawNextBigPicture()
 {
-    const std::unique_ptr<BigPicture> job = std::move(mBigPictures.front());
-    mBigPictures.pop_front();
+    const std::unique_ptr<BigPicture> job = std::move(m_bigPictures.front());
+    m_bigPictures.pop_front();
     if (job->decoder.valid())
         job->decoder.wait();
     const QFileInfo title(QString::fromStdString(job->archive->getPath()));
@@ -215,10 +215,11 @@ void ThumbnailRender::drawNextBigPicture()
 void ThumbnailRender::createBigSizeCanvasSceneUsingArchiveData(const Archive& archive,
                                                                const QImage& background)
 {
-    mBigBackground = new GraphicsPixmap(archive.getFullPathOfBgResourceBig(), QPixmap::fromImage(background));
-    mBigScene.addItem(mBigBackground);
-    mBigBackground->setPos(0, 0);
-    mBigBackground->setZValue(archive.getBgPointZ());
+    m_bigBackground =
+        new GraphicsPixmap(archive.getFullPathOfBgResourceBig(), QPixmap::fromImage(background));
+    m_bigScene.addItem(m_bigBackground);
+    m_bigBackground->setPos(0, 0);
+    m_bigBackground->setZValue(archive.getBgPointZ());
     for (TText* record : archive.text()) {
         auto* text = new GraphicsText(record, record->getTextObjectID());
         text->setRadio(RASTER_RATIO, true);
@@ -226,27 +227,27 @@ void ThumbnailRender::createBigSizeCanvasSceneUsingArchiveData(const Archive& ar
                      record->getYValue() * TO_DOUBLE_RASTER * TO_RASTER);
         text->setZValue(record->getZValue());
         text->initShowText();
-        mBigScene.addItem(text);
+        m_bigScene.addItem(text);
     }
-    limitTextsToRaster(mBigScene);
+    limitTextsToRaster(m_bigScene);
 }
 
 QList<QImage> ThumbnailRender::renderBigAndMiddleSizeCanvasScene()
 {
-    const QImage big = renderScene(mBigScene, THUMBNAIL_BIG_SIZE);
+    const QImage big = renderScene(m_bigScene, THUMBNAIL_BIG_SIZE);
     const QImage middle = big.scaled(THUMBNAIL_MIDDLE_SIZE, Qt::IgnoreAspectRatio, Qt::SmoothTransformation);
     return {big, middle};
 }
 
 void ThumbnailRender::saveBigSizeThumnail(const Archive& archive, const QList<QImage>& images)
 {
-    mPictureThread.addArchive(&archive, images);
+    m_pictureThread.addArchive(&archive, images);
 }
 
 void ThumbnailRender::clearBigSizeCanvasScene()
 {
-    mBigScene.clear();
-    mBigBackground = nullptr;
+    m_bigScene.clear();
+    m_bigBackground = nullptr;
     clearBigSizeCanvasSceneResource();
 }
 

@@ -78,10 +78,10 @@ private:
         std::future<void> decoder;
     };
 
-    std::deque<std::unique_ptr<BigPicture>> mBigPictures;
-    QGraphicsScene mMiddleScene;
-    QGraphicsScene mBigScene;
-    GraphicsPixmap* mMiddleBackground = nullptr; // owned by mMiddleScene
-    GraphicsPixmap* mBigBackground = nullptr;    // owned by mBigScene
-    PictureThread mPictureThread;                // last, so that it is destroyed before the scenes
+    std::deque<std::unique_ptr<BigPicture>> m_bigPictures;
+    QGraphicsScene m_middleScene;
+    QGraphicsScene m_bigScene;
+    GraphicsPixmap* m_middleBackground = nullptr; // owned by m_middleScene
+    GraphicsPixmap* m_bigBackground = nullptr;    // owned by m_bigScene
+    PictureThread m_pictureThread;                // last, so that it is destroyed before the scenes
 };

@@ -92,7 +92,7 @@ void removeFiles(const Archive& archive, const std::string& stem)
 
 } // namespace
 
-TitleFileOperations::TitleFileOperations(ArchiveController& controller) : mController(controller)
+TitleFileOperations::TitleFileOperations(ArchiveController& controller) : m_controller(controller)
 {
 }
 
@@ -139,9 +139,9 @@ std::unique_ptr<Archive> TitleFileOperations::createFromTemplate(const QString& 
     auto archive = std::make_unique<Archive>(source);
     renameRecord(*archive, folder);
     Archive from(source);
-    mController.copyArchiveThumbnail(&from, archive.get());
-    const bool isCopied = !hasOwnBackground(source) || mController.copyArchiveBg(&from, archive.get()) == 1;
-    if (!isCopied || !mController.saveNewArchive(folder, archive.get())) {
+    m_controller.copyArchiveThumbnail(&from, archive.get());
+    const bool isCopied = !hasOwnBackground(source) || m_controller.copyArchiveBg(&from, archive.get()) == 1;
+    if (!isCopied || !m_controller.saveNewArchive(folder, archive.get())) {
         removeFiles(*archive, archive->getName());
         return nullptr;
     }
@@ -171,10 +171,10 @@ std::unique_ptr<Archive> TitleFileOperations::createFromCopy(const QString& fold
     bool isCopied = true;
     if (hasOwnBackground(copy)) {
         Archive from(copy);
-        isCopied = mController.copyArchiveBg(&from, archive.get()) == 1;
+        isCopied = m_controller.copyArchiveBg(&from, archive.get()) == 1;
     }
     written.wait();
-    if (!isCopied || !mController.saveNewArchive(folder, archive.get())) {
+    if (!isCopied || !m_controller.saveNewArchive(folder, archive.get())) {
         removeFiles(*archive, archive->getName());
         return nullptr;
     }
@@ -212,9 +212,9 @@ std::unique_ptr<Archive> TitleFileOperations::createUserTemplate(const QString& 
         if (!source.getBgResourceBig().empty())
             target->setBgResourceBig((TEMPLATE_STEM + BG_SOURCE_BIG + extension).toStdString());
         Archive from(source);
-        isCopied = mController.copyArchiveBg(&from, target.get()) == 1;
+        isCopied = m_controller.copyArchiveBg(&from, target.get()) == 1;
     }
-    if (!isCopied || !mController.saveNewArchive(root, target.get())) {
+    if (!isCopied || !m_controller.saveNewArchive(root, target.get())) {
         removeFiles(*target, TEMPLATE_STEM.toStdString());
         QDir().rmdir(folder); // removes it only if it is empty
         return nullptr;

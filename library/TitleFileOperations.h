@@ -61,5 +61,5 @@ public:
 private:
     void renameRecord(Archive& archive, const QString& folder) const;
 
-    ArchiveController& mController;
+    ArchiveController& m_controller;
 };

@@ -20,9 +20,9 @@ TitlerTabWidget::TitlerTabWidget(QWidget* parent) : KSTabWidget(parent)
 
 void TitlerTabWidget::setPainLine(int x, int y)
 {
-    mFrame = DrawBoundingRectangle().paintBoundingRectangle(LIST_PANE);
-    mFrameX = x;
-    mFrameY = y;
+    m_frame = DrawBoundingRectangle().paintBoundingRectangle(LIST_PANE);
+    m_frameX = x;
+    m_frameY = y;
     update();
 }
 
@@ -30,6 +30,6 @@ void TitlerTabWidget::paintEvent(QPaintEvent* event)
 {
     KSTabWidget::paintEvent(event);
     QPainter painter(this);
-    painter.drawPixmap(mFrameX, mFrameY, mFrame);
+    painter.drawPixmap(m_frameX, m_frameY, m_frame);
     painter.fillRect(0, 0, width(), tabBar()->height() - TAB_OVERLAP, DIALOG_COLOR);
 }

@@ -19,7 +19,7 @@ protected:
     void paintEvent(QPaintEvent* event) override;
 
 private:
-    QPixmap mFrame;
-    int mFrameX = 0;
-    int mFrameY = 0;
+    QPixmap m_frame;
+    int m_frameX = 0;
+    int m_frameY = 0;
 };

@@ -4,7 +4,7 @@
 
 #include <QMutexLocker>
 
-UndoThread::UndoThread(ArchiveList* list, QObject* parent) : QThread(parent), mList(list)
+UndoThread::UndoThread(ArchiveList* list, QObject* parent) : QThread(parent), m_list(list)
 {
 }
 
@@ -15,6 +15,6 @@ UndoThread::~UndoThread()
 
 void UndoThread::run()
 {
-    QMutexLocker lock(&mMutex);
-    mList->startPicker();
+    QMutexLocker lock(&m_mutex);
+    m_list->startPicker();
 }

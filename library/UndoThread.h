@@ -19,6 +19,6 @@ protected:
     void run() override;
 
 private:
-    ArchiveList* mList;
-    QMutex mMutex;
+    ArchiveList* m_list;
+    QMutex m_mutex;
 };

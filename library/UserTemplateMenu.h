@@ -18,5 +18,5 @@ public:
     ArchiveAction* action(ArchiveAction::ARCHIVE_ACTION_TYPE type) const;
 
 private:
-    QList<ArchiveAction*> mActions; // owned by this menu as their parent
+    QList<ArchiveAction*> m_actions; // owned by this menu as their parent
 };

@@ -29,22 +29,22 @@ AlternateStack::AlternateStack()
                                MAP_PRIVATE | MAP_ANONYMOUS | MAP_STACK, -1, 0);
     if (pages == MAP_FAILED)
         return;
-    mPages = pages;
+    m_pages = pages;
     stack_t stack = {};
     stack.ss_sp = static_cast<char*>(pages) + GUARD_BYTES;
     stack.ss_size = STACK_BYTES;
     if (::mprotect(pages, GUARD_BYTES, PROT_NONE) != 0 || ::sigaltstack(&stack, nullptr) != 0) {
-        ::munmap(mPages, GUARD_BYTES + STACK_BYTES);
-        mPages = nullptr;
+        ::munmap(m_pages, GUARD_BYTES + STACK_BYTES);
+        m_pages = nullptr;
     }
 }
 
 AlternateStack::~AlternateStack()
 {
-    if (!mPages)
+    if (!m_pages)
         return;
     stack_t none = {};
     none.ss_flags = SS_DISABLE;
     if (::sigaltstack(&none, nullptr) == 0)
-        ::munmap(mPages, GUARD_BYTES + STACK_BYTES);
+        ::munmap(m_pages, GUARD_BYTES + STACK_BYTES);
 }

@@ -18,5 +18,5 @@ private:
     AlternateStack();
     ~AlternateStack();
 
-    void* mPages = nullptr;
+    void* m_pages = nullptr;
 };

@@ -23,23 +23,23 @@ constexpr int READ_ATTEMPTS = 3;
 class Descriptor
 {
 public:
-    explicit Descriptor(int descriptor) : mDescriptor(descriptor) {}
+    explicit Descriptor(int descriptor) : m_descriptor(descriptor) {}
     Descriptor(const Descriptor&) = delete;
     Descriptor& operator=(const Descriptor&) = delete;
     ~Descriptor() { close(); }
 
-    int get() const { return mDescriptor; }
-    bool isOpen() const { return mDescriptor >= 0; }
+    int get() const { return m_descriptor; }
+    bool isOpen() const { return m_descriptor >= 0; }
 
     bool close()
     {
-        const int descriptor = mDescriptor;
-        mDescriptor = -1;
+        const int descriptor = m_descriptor;
+        m_descriptor = -1;
         return descriptor < 0 || ::close(descriptor) == 0;
     }
 
 private:
-    int mDescriptor;
+    int m_descriptor;
 };
 
 bool isMainThread()

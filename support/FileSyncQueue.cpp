@@ -46,10 +46,10 @@ public:
 
     bool publish(const std::string& temporary, const std::string& path)
     {
-        const std::lock_guard lock(mMutex);
+        const std::lock_guard lock(m_mutex);
         // A file that is still queued is not on the disk yet, so the version that was kept for it remains the
         // one to keep.
-        const bool isQueued = mEntries.contains(path);
+        const bool isQueued = m_entries.contains(path);
         const std::string kept = isQueued ? std::string() : HiddenName::kept(path);
         const bool isLinked = !kept.empty() && ::link(path.c_str(), kept.c_str()) == 0;
         const bool isKept = isLinked || (!kept.empty() && errno == EEXIST);
@@ -66,20 +66,20 @@ public:
 
     bool publishSynced(const std::string& temporary, const std::string& path)
     {
-        const std::lock_guard lock(mMutex);
+        const std::lock_guard lock(m_mutex);
         return std::rename(temporary.c_str(), path.c_str()) == 0;
     }
 
     void enqueue(const std::string& path)
     {
-        const std::lock_guard lock(mMutex);
+        const std::lock_guard lock(m_mutex);
         add(path, false);
     }
 
     void settleKept(const std::string& path, FileSyncQueue::Kept decision)
     {
-        const std::lock_guard lock(mMutex);
-        if (mEntries.contains(path))
+        const std::lock_guard lock(m_mutex);
+        if (m_entries.contains(path))
             return;
         const std::string kept = HiddenName::kept(path);
         if (decision == FileSyncQueue::Kept::Discard)
@@ -92,37 +92,37 @@ public:
 
     std::vector<std::string> unsynced()
     {
-        const std::lock_guard lock(mMutex);
-        std::vector<std::string> paths(mFailed.begin(), mFailed.end());
-        for (const auto& [path, entry] : mEntries)
+        const std::lock_guard lock(m_mutex);
+        std::vector<std::string> paths(m_failed.begin(), m_failed.end());
+        for (const auto& [path, entry] : m_entries)
             paths.push_back(path);
         return paths;
     }
 
     std::vector<std::string> failed()
     {
-        const std::lock_guard lock(mMutex);
-        return {mFailed.begin(), mFailed.end()};
+        const std::lock_guard lock(m_mutex);
+        return {m_failed.begin(), m_failed.end()};
     }
 
     void forgetFailed(const std::string& path)
     {
-        const std::lock_guard lock(mMutex);
-        mFailed.erase(path);
+        const std::lock_guard lock(m_mutex);
+        m_failed.erase(path);
     }
 
     void setListener(std::function<void()> listener)
     {
-        const std::lock_guard lock(mMutex);
-        mListener = std::move(listener);
+        const std::lock_guard lock(m_mutex);
+        m_listener = std::move(listener);
     }
 
     bool flush(std::chrono::milliseconds deadline)
     {
-        std::unique_lock lock(mMutex);
+        std::unique_lock lock(m_mutex);
         const bool isIdle =
-            mIdle.wait_for(lock, deadline, [this] { return mEntries.empty() && !mIsDiscarding; });
-        return isIdle && mFailed.empty();
+            m_idle.wait_for(lock, deadline, [this] { return m_entries.empty() && !m_isDiscarding; });
+        return isIdle && m_failed.empty();
     }
 
 private:
@@ -133,27 +133,27 @@ private:
 
     void add(const std::string& path, bool isKept)
     {
-        mFailed.erase(path);
-        Entry& entry = mEntries[path];
+        m_failed.erase(path);
+        Entry& entry = m_entries[path];
         if (entry.generation++ == 0)
-            mOrder.push_back(path);
+            m_order.push_back(path);
         entry.isKept |= isKept;
-        if (!mIsRunning) {
-            mIsRunning = true;
+        if (!m_isRunning) {
+            m_isRunning = true;
             std::thread(&Queue::run, this).detach();
         }
-        mWork.notify_one();
+        m_work.notify_one();
     }
 
     void run()
     {
         AlternateStack::useInThisThread();
-        std::unique_lock lock(mMutex);
+        std::unique_lock lock(m_mutex);
         for (;;) {
-            mWork.wait(lock, [this] { return !mOrder.empty(); });
-            const std::string path = mOrder.front();
-            mOrder.pop_front();
-            const unsigned long generation = mEntries[path].generation;
+            m_work.wait(lock, [this] { return !m_order.empty(); });
+            const std::string path = m_order.front();
+            m_order.pop_front();
+            const unsigned long generation = m_entries[path].generation;
             lock.unlock();
             SyncResult result = syncOne(path, 0);
             if (result != SyncResult::Failed &&
@@ -167,9 +167,9 @@ private:
     void finish(const std::string& path, unsigned long generation, SyncResult result,
                 std::unique_lock<std::mutex>& lock)
     {
-        const auto entry = mEntries.find(path);
+        const auto entry = m_entries.find(path);
         if (entry->second.generation != generation) { // saved again in the meantime
-            mOrder.push_back(path);
+            m_order.push_back(path);
             return;
         }
         // The file is on the disk now; the next save will keep it as the last synced version. The old version
@@ -180,35 +180,35 @@ private:
             discarded = HiddenName::temporary(HiddenName::folderOf(path));
             std::rename(HiddenName::kept(path).c_str(), discarded.c_str());
         }
-        mEntries.erase(entry);
+        m_entries.erase(entry);
         if (result == SyncResult::Failed) {
-            mFailed.insert(path);
-            if (const std::function<void()> listener = mListener) {
+            m_failed.insert(path);
+            if (const std::function<void()> listener = m_listener) {
                 lock.unlock();
                 listener();
                 lock.lock();
             }
         }
         if (!discarded.empty()) {
-            mIsDiscarding = true;
+            m_isDiscarding = true;
             lock.unlock();
             ::unlink(discarded.c_str());
             lock.lock();
-            mIsDiscarding = false;
+            m_isDiscarding = false;
         }
-        if (mEntries.empty())
-            mIdle.notify_all();
+        if (m_entries.empty())
+            m_idle.notify_all();
     }
 
-    std::mutex mMutex;
-    std::condition_variable mWork;
-    std::condition_variable mIdle;
-    std::unordered_map<std::string, Entry> mEntries;
-    std::deque<std::string> mOrder;
-    std::set<std::string> mFailed;
-    std::function<void()> mListener;
-    bool mIsRunning = false;
-    bool mIsDiscarding = false;
+    std::mutex m_mutex;
+    std::condition_variable m_work;
+    std::condition_variable m_idle;
+    std::unordered_map<std::string, Entry> m_entries;
+    std::deque<std::string> m_order;
+    std::set<std::string> m_failed;
+    std::function<void()> m_listener;
+    bool m_isRunning = false;
+    bool m_isDiscarding = false;
 };
 
 } // namespace

@@ -35,7 +35,7 @@ private:
     void makeRoomFor(std::size_t size);
     bool moveAside() const;
 
-    std::string mPath;
-    std::mutex mMutex; // guards the members below
-    int mDescriptor = -1;
+    std::string m_path;
+    std::mutex m_mutex; // guards the members below
+    int m_descriptor = -1;
 };

@@ -43,7 +43,7 @@ void PathManagerEx::clearUp()
 }
 
 PathManagerEx::PathManagerEx()
-    : mBasePath(getDefaultPath()), mPathFile(wideToMultiByte(mBasePath) + "PathInfo.xml")
+    : m_basePath(getDefaultPath()), m_pathFile(wideToMultiByte(m_basePath) + "PathInfo.xml")
 {
 }
 
@@ -64,22 +64,22 @@ std::wstring PathManagerEx::getDefaultPath()
 std::wstring PathManagerEx::getFolderPath(const std::string& node)
 {
     IXMLLoader* const loader = IXMLLoader::getInstance();
-    mScratchPath.clear();
-    if (!loader->load(mPathFile))
+    m_scratchPath.clear();
+    if (!loader->load(m_pathFile))
         return {};
     loader->selectRootNode();
     if (!loader->selectNode(node))
         return {};
     loader->selectRootNode();
-    mScratchPath = wideToMultiByte(mBasePath) + loader->getAttribute(node, "path");
-    if (!boost::filesystem::exists(mScratchPath))
-        boost::filesystem::create_directories(mScratchPath);
-    return multiByteToWide(mScratchPath);
+    m_scratchPath = wideToMultiByte(m_basePath) + loader->getAttribute(node, "path");
+    if (!boost::filesystem::exists(m_scratchPath))
+        boost::filesystem::create_directories(m_scratchPath);
+    return multiByteToWide(m_scratchPath);
 }
 
 std::wstring PathManagerEx::cached(std::wstring& cache, const char* node)
 {
-    const std::lock_guard lock(mMutex);
+    const std::lock_guard lock(m_mutex);
     if (cache.empty())
         cache = getFolderPath(node);
     return cache;
@@ -112,105 +112,105 @@ std::string PathManagerEx::char_to_string(unsigned char byte)
 
 std::wstring PathManagerEx::getTitlerPath()
 {
-    return cached(mTitlerPath, "Titler");
+    return cached(m_titlerPath, "Titler");
 }
 
 std::wstring PathManagerEx::getProjectPath()
 {
-    return cached(mProjectPath, "Project");
+    return cached(m_projectPath, "Project");
 }
 
 std::wstring PathManagerEx::getProjectsPath()
 {
-    return cached(mProjectsPath, "Projects");
+    return cached(m_projectsPath, "Projects");
 }
 
 std::wstring PathManagerEx::getTemplatesPath()
 {
-    return cached(mTemplatesPath, "Template");
+    return cached(m_templatesPath, "Template");
 }
 
 std::wstring PathManagerEx::getCurrentStatusPath()
 {
-    return cached(mCurrentStatusPath, "CurrentStatus");
+    return cached(m_currentStatusPath, "CurrentStatus");
 }
 
 std::wstring PathManagerEx::getStreamKeyPath()
 {
-    return cached(mStreamKeyPath, "StreamKey");
+    return cached(m_streamKeyPath, "StreamKey");
 }
 
 std::wstring PathManagerEx::getSystemSettingPath()
 {
-    return cached(mSystemSettingPath, "SystemSetting");
+    return cached(m_systemSettingPath, "SystemSetting");
 }
 
 std::wstring PathManagerEx::getTitlerTemplatesPath()
 {
-    return cached(mTitlerTemplatesPath, "TitlerTemplate");
+    return cached(m_titlerTemplatesPath, "TitlerTemplate");
 }
 
 std::wstring PathManagerEx::getMPMoviesPath()
 {
-    return cached(mMPMoviesPath, "Movie");
+    return cached(m_mpMoviesPath, "Movie");
 }
 
 std::wstring PathManagerEx::getTitleImagesPath()
 {
-    return cached(mTitleImagesPath, "TitleImage");
+    return cached(m_titleImagesPath, "TitleImage");
 }
 
 std::wstring PathManagerEx::getTitleResourcesPath()
 {
-    return cached(mTitleResourcesPath, "TitleResource");
+    return cached(m_titleResourcesPath, "TitleResource");
 }
 
 std::wstring PathManagerEx::getMoviesPath()
 {
-    return cached(mMoviesPath, "Movie");
+    return cached(m_moviesPath, "Movie");
 }
 
 std::wstring PathManagerEx::getAudiosPath()
 {
-    return cached(mAudiosPath, "Audio");
+    return cached(m_audiosPath, "Audio");
 }
 
 std::wstring PathManagerEx::getFontsPath()
 {
-    return cached(mFontsPath, "Font");
+    return cached(m_fontsPath, "Font");
 }
 
 std::wstring PathManagerEx::getVODsPath()
 {
-    return cached(mVODsPath, "VOD");
+    return cached(m_vodsPath, "VOD");
 }
 
 std::wstring PathManagerEx::getMXFsPath()
 {
-    return cached(mMXFsPath, "MXF");
+    return cached(m_mxfsPath, "MXF");
 }
 
 std::wstring PathManagerEx::getLogosPath()
 {
-    return cached(mLogosPath, "Logo");
+    return cached(m_logosPath, "Logo");
 }
 
 std::wstring PathManagerEx::getTiltesPath()
 {
-    return cached(mTitlesPath, "Title");
+    return cached(m_titlesPath, "Title");
 }
 
 std::wstring PathManagerEx::getTmpPath()
 {
-    return cached(mTmpPath, "tmp");
+    return cached(m_tmpPath, "tmp");
 }
 
 std::wstring PathManagerEx::getResourcesPath()
 {
-    return cached(mResourcesPath, "Resource");
+    return cached(m_resourcesPath, "Resource");
 }
 
 std::wstring PathManagerEx::getDataPath()
 {
-    return cached(mDataPath, "Data");
+    return cached(m_dataPath, "Data");
 }

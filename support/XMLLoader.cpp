@@ -29,7 +29,7 @@ void IXMLLoader::cleanUp()
     m_pXmlLoader = nullptr;
 }
 
-XMLLoader::XMLLoader() : mRoot(nullptr), mCurrent(nullptr)
+XMLLoader::XMLLoader() : m_root(nullptr), m_current(nullptr)
 {
 }
 
@@ -37,20 +37,20 @@ XMLLoader::~XMLLoader() = default;
 
 bool XMLLoader::load(const std::string& path)
 {
-    mRoot = mCurrent = nullptr;
-    mDocument = std::make_unique<TiXmlDocument>();
-    if (!XmlFile::load(path, *mDocument)) {
-        mDocument.reset();
+    m_root = m_current = nullptr;
+    m_document = std::make_unique<TiXmlDocument>();
+    if (!XmlFile::load(path, *m_document)) {
+        m_document.reset();
         return false;
     }
-    mRoot = mCurrent = mDocument->RootElement();
+    m_root = m_current = m_document->RootElement();
     return true;
 }
 
 bool XMLLoader::selectRootNode()
 {
-    mCurrent = mRoot;
-    return mCurrent;
+    m_current = m_root;
+    return m_current;
 }
 
 bool XMLLoader::GetPointerByNodeName(TiXmlElement* element, const std::string& name, TiXmlElement*& out)
@@ -68,7 +68,7 @@ bool XMLLoader::GetPointerByNodeName(TiXmlElement* element, const std::string& n
 
 bool XMLLoader::selectNode(const std::string& name)
 {
-    return GetPointerByNodeName(mCurrent, name, mCurrent);
+    return GetPointerByNodeName(m_current, name, m_current);
 }
 
 std::string XMLLoader::getAttributeFromNode(TiXmlElement* element, const std::string& node,
@@ -83,13 +83,13 @@ std::string XMLLoader::getAttributeFromNode(TiXmlElement* element, const std::st
 
 std::string XMLLoader::getAttribute(const std::string& node, const std::string& key)
 {
-    return getAttributeFromNode(mCurrent, node, key);
+    return getAttributeFromNode(m_current, node, key);
 }
 
 std::string XMLLoader::getText(const std::string& node)
 {
     TiXmlElement* found = nullptr;
-    if (!GetPointerByNodeName(mCurrent, node, found))
+    if (!GetPointerByNodeName(m_current, node, found))
         return {};
     const char* text = found->GetText();
     return text ? text : std::string();
@@ -98,7 +98,7 @@ std::string XMLLoader::getText(const std::string& node)
 bool XMLLoader::setAttribute(const std::string& node, const std::string& key, const std::string& value)
 {
     TiXmlElement* found = nullptr;
-    if (!GetPointerByNodeName(mCurrent, node, found))
+    if (!GetPointerByNodeName(m_current, node, found))
         return false;
     found->SetAttribute(key, value);
     return true;
@@ -107,7 +107,7 @@ bool XMLLoader::setAttribute(const std::string& node, const std::string& key, co
 bool XMLLoader::deleteAttribute(const std::string& node, const std::string& key)
 {
     TiXmlElement* found = nullptr;
-    if (!GetPointerByNodeName(mCurrent, node, found))
+    if (!GetPointerByNodeName(m_current, node, found))
         return false;
     found->RemoveAttribute(key);
     return true;
@@ -115,14 +115,14 @@ bool XMLLoader::deleteAttribute(const std::string& node, const std::string& key)
 
 bool XMLLoader::save(const std::string& path)
 {
-    return mDocument && XmlFile::save(*mDocument, path);
+    return m_document && XmlFile::save(*m_document, path);
 }
 
 bool XMLLoader::createEmptyXML(const std::string& path)
 {
-    mDocument = std::make_unique<TiXmlDocument>();
-    mDocument->LinkEndChild(new TiXmlDeclaration("1.0", "utf-8", ""));
-    mRoot = mCurrent = new TiXmlElement("root");
-    mDocument->LinkEndChild(mRoot);
+    m_document = std::make_unique<TiXmlDocument>();
+    m_document->LinkEndChild(new TiXmlDeclaration("1.0", "utf-8", ""));
+    m_root = m_current = new TiXmlElement("root");
+    m_document->LinkEndChild(m_root);
     return save(path);
 }

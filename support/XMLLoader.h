@@ -30,7 +30,7 @@ private:
     static std::string getAttributeFromNode(TiXmlElement* element, const std::string& node,
                                             const std::string& key);
 
-    std::unique_ptr<TiXmlDocument> mDocument;
-    TiXmlElement* mRoot;    // owned by mDocument
-    TiXmlElement* mCurrent; // owned by mDocument
+    std::unique_ptr<TiXmlDocument> m_document;
+    TiXmlElement* m_root;    // owned by m_document
+    TiXmlElement* m_current; // owned by m_document
 };

@@ -43,15 +43,15 @@ void normaliseLineEnds(std::string& bytes)
 class Printer
 {
 public:
-    std::string take() { return std::move(mBytes); }
+    std::string take() { return std::move(m_bytes); }
 
     void print(const TiXmlDocument& document)
     {
         if (document.GetUserData() == &gMarked)
-            mBytes += BYTE_ORDER_MARK;
+            m_bytes += BYTE_ORDER_MARK;
         for (const TiXmlNode* node = document.FirstChild(); node; node = node->NextSibling()) {
             print(*node, 0);
-            mBytes += '\n';
+            m_bytes += '\n';
         }
     }
 
@@ -67,7 +67,7 @@ private:
         if (std::FILE* const stream = ::open_memstream(&text, &size)) {
             node.Print(stream, depth);
             std::fclose(stream);
-            mBytes.append(text, size);
+            m_bytes.append(text, size);
             std::free(text);
         }
     }
@@ -75,33 +75,33 @@ private:
     void printElement(const TiXmlElement& element, int depth)
     {
         indent(depth);
-        mBytes += '<';
-        mBytes += element.ValueStr();
+        m_bytes += '<';
+        m_bytes += element.ValueStr();
         for (const TiXmlAttribute* attribute = element.FirstAttribute(); attribute;
              attribute = attribute->Next()) {
-            mBytes += ' ';
+            m_bytes += ' ';
             printAttribute(*attribute);
         }
         const TiXmlNode* const first = element.FirstChild();
         if (!first) {
-            mBytes += " />";
+            m_bytes += " />";
             return;
         }
-        mBytes += '>';
+        m_bytes += '>';
         if (first == element.LastChild() && first->ToText()) {
             print(*first, depth + 1);
         } else {
             for (const TiXmlNode* node = first; node; node = node->NextSibling()) {
                 if (!node->ToText())
-                    mBytes += '\n';
+                    m_bytes += '\n';
                 print(*node, depth + 1);
             }
-            mBytes += '\n';
+            m_bytes += '\n';
             indent(depth);
         }
-        mBytes += "</";
-        mBytes += element.ValueStr();
-        mBytes += '>';
+        m_bytes += "</";
+        m_bytes += element.ValueStr();
+        m_bytes += '>';
     }
 
     void printAttribute(const TiXmlAttribute& attribute)
@@ -109,10 +109,10 @@ private:
         const std::string& value = attribute.ValueStr();
         const char quote = value.find('"') == std::string::npos ? '"' : '\'';
         append(attribute.NameTStr());
-        mBytes += '=';
-        mBytes += quote;
+        m_bytes += '=';
+        m_bytes += quote;
         append(value);
-        mBytes += quote;
+        m_bytes += quote;
     }
 
     // As TiXmlBase::EncodeString, except for "&#x" in a text: TinyXML writes that unescaped, and no reader
@@ -125,32 +125,32 @@ private:
             const auto c = static_cast<unsigned char>(text[i]);
             if (!isReserved(c))
                 continue;
-            mBytes.append(text, done, i - done);
+            m_bytes.append(text, done, i - done);
             done = i + 1;
             switch (c) {
             case '&':
-                mBytes += "&amp;";
+                m_bytes += "&amp;";
                 break;
             case '<':
-                mBytes += "&lt;";
+                m_bytes += "&lt;";
                 break;
             case '>':
-                mBytes += "&gt;";
+                m_bytes += "&gt;";
                 break;
             case '"':
-                mBytes += "&quot;";
+                m_bytes += "&quot;";
                 break;
             case '\'':
-                mBytes += "&apos;";
+                m_bytes += "&apos;";
                 break;
             default:
-                mBytes += "&#x";
-                mBytes += DIGITS[c >> 4];
-                mBytes += DIGITS[c & 15];
-                mBytes += ';';
+                m_bytes += "&#x";
+                m_bytes += DIGITS[c >> 4];
+                m_bytes += DIGITS[c & 15];
+                m_bytes += ';';
             }
         }
-        mBytes.append(text, done);
+        m_bytes.append(text, done);
     }
 
     static bool isReserved(unsigned char c)
@@ -158,9 +158,9 @@ private:
         return c < 32 || c == '&' || c == '<' || c == '>' || c == '"' || c == '\'';
     }
 
-    void indent(int depth) { mBytes.append(static_cast<std::size_t>(depth) * 4, ' '); }
+    void indent(int depth) { m_bytes.append(static_cast<std::size_t>(depth) * 4, ' '); }
 
-    std::string mBytes;
+    std::string m_bytes;
 };
 
 } // namespace

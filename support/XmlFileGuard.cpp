@@ -15,22 +15,22 @@ class StructureScan
 {
 public:
     explicit StructureScan(std::string_view bytes)
-        : mPos(bytes.data())
-        , mEnd(mPos + bytes.size())
-        , mHasReferences(bytes.find("&#") != std::string_view::npos)
+        : m_pos(bytes.data())
+        , m_end(m_pos + bytes.size())
+        , m_hasReferences(bytes.find("&#") != std::string_view::npos)
     {
     }
 
     bool run()
     {
-        while (mPos != mEnd) {
-            const bool isInRange = mDepth == 0 ? scanTopLevel() : scanContent();
+        while (m_pos != m_end) {
+            const bool isInRange = m_depth == 0 ? scanTopLevel() : scanContent();
             if (!isInRange)
                 return false;
-            if (mIsDone)
+            if (m_isDone)
                 return true;
         }
-        return mDepth == 0;
+        return m_depth == 0;
     }
 
 private:
@@ -51,41 +51,41 @@ private:
     void skipSpace()
     {
         for (;;)
-            if (mPos != mEnd && isSpace(*mPos))
-                ++mPos;
+            if (m_pos != m_end && isSpace(*m_pos))
+                ++m_pos;
             else if (startsWith("\xEF\xBB\xBF") || startsWith("\xEF\xBF\xBE") || startsWith("\xEF\xBF\xBF"))
-                mPos += 3;
+                m_pos += 3;
             else
                 return;
     }
 
     bool startsWithIgnoringCase(std::string_view lowerCaseTag) const
     {
-        if (static_cast<std::size_t>(mEnd - mPos) < lowerCaseTag.size())
+        if (static_cast<std::size_t>(m_end - m_pos) < lowerCaseTag.size())
             return false;
-        return strncasecmp(mPos, lowerCaseTag.data(), lowerCaseTag.size()) == 0;
+        return strncasecmp(m_pos, lowerCaseTag.data(), lowerCaseTag.size()) == 0;
     }
 
     bool startsWith(std::string_view tag) const
     {
-        return static_cast<std::size_t>(mEnd - mPos) >= tag.size() &&
-               std::memcmp(mPos, tag.data(), tag.size()) == 0;
+        return static_cast<std::size_t>(m_end - m_pos) >= tag.size() &&
+               std::memcmp(m_pos, tag.data(), tag.size()) == 0;
     }
 
     // Moves behind the next occurrence of a byte; returns false, at the end, if there is none.
     bool skipPast(char byte)
     {
         const auto* found =
-            static_cast<const char*>(std::memchr(mPos, byte, static_cast<std::size_t>(mEnd - mPos)));
-        mPos = found ? found + 1 : mEnd;
+            static_cast<const char*>(std::memchr(m_pos, byte, static_cast<std::size_t>(m_end - m_pos)));
+        m_pos = found ? found + 1 : m_end;
         return found;
     }
 
     bool skipPast(std::string_view tag)
     {
-        while (mPos != mEnd && skipPast(tag.front())) {
+        while (m_pos != m_end && skipPast(tag.front())) {
             if (startsWith(tag.substr(1))) {
-                mPos += tag.size() - 1;
+                m_pos += tag.size() - 1;
                 return true;
             }
         }
@@ -96,7 +96,7 @@ private:
     // quotes and tags and would see another structure than this scan.
     bool hasGoodReferences(const char* p, const char* end) const
     {
-        if (!mHasReferences)
+        if (!m_hasReferences)
             return true;
         while ((p = static_cast<const char*>(std::memchr(p, '&', static_cast<std::size_t>(end - p))))) {
             if (end - ++p < 1 || *p != '#')
@@ -130,10 +130,10 @@ private:
     bool scanTopLevel()
     {
         skipSpace();
-        if (mPos == mEnd)
+        if (m_pos == m_end)
             return true;
-        if (*mPos != '<') {
-            mIsDone = true;
+        if (*m_pos != '<') {
+            m_isDone = true;
             return true;
         }
         return scanMarkup();
@@ -142,30 +142,30 @@ private:
     bool scanContent()
     {
         const auto* next =
-            static_cast<const char*>(std::memchr(mPos, '<', static_cast<std::size_t>(mEnd - mPos)));
-        if (!next || !hasGoodReferences(mPos, next))
+            static_cast<const char*>(std::memchr(m_pos, '<', static_cast<std::size_t>(m_end - m_pos)));
+        if (!next || !hasGoodReferences(m_pos, next))
             return false;
-        mPos = next;
+        m_pos = next;
         if (!startsWith("</"))
             return scanMarkup();
-        --mDepth;
+        --m_depth;
         return skipPast('>');
     }
 
     bool scanMarkup()
     {
-        if (mEnd - mPos > 1 && isNameStart(mPos[1])) {
-            ++mPos;
+        if (m_end - m_pos > 1 && isNameStart(m_pos[1])) {
+            ++m_pos;
             return scanElement();
         }
         // An unterminated construct at the end of the file has no effect outside the root element.
         if (startsWithIgnoringCase("<?xml"))
             return scanDeclaration();
         if (startsWith("<!--")) {
-            mPos += 4;
+            m_pos += 4;
             skipPast("-->");
         } else if (startsWith("<![CDATA[")) {
-            mPos += 9;
+            m_pos += 9;
             skipPast("]]>");
         } else {
             skipPast('>');
@@ -175,23 +175,23 @@ private:
 
     bool scanDeclaration()
     {
-        for (mPos += 5; mPos != mEnd;) {
+        for (m_pos += 5; m_pos != m_end;) {
             skipSpace();
-            if (mPos == mEnd)
+            if (m_pos == m_end)
                 break;
-            if (*mPos == '>') {
-                ++mPos;
+            if (*m_pos == '>') {
+                ++m_pos;
                 break;
             }
             if (startsWithIgnoringCase("version") || startsWithIgnoringCase("encoding") ||
                 startsWithIgnoringCase("standalone")) {
                 if (!scanAttribute()) { // TinyXML stops here, which is an error only inside the root element
-                    mIsDone = true;
-                    return mDepth == 0;
+                    m_isDone = true;
+                    return m_depth == 0;
                 }
             } else {
-                while (mPos != mEnd && *mPos != '>' && !isSpace(*mPos))
-                    ++mPos;
+                while (m_pos != m_end && *m_pos != '>' && !isSpace(*m_pos))
+                    ++m_pos;
             }
         }
         return true;
@@ -199,22 +199,22 @@ private:
 
     bool scanElement()
     {
-        if (mDepth + 1 > XmlFileGuard::MAX_DEPTH)
+        if (m_depth + 1 > XmlFileGuard::MAX_DEPTH)
             return false;
-        while (mPos != mEnd && isNameChar(*mPos))
-            ++mPos;
+        while (m_pos != m_end && isNameChar(*m_pos))
+            ++m_pos;
         for (int attributes = 0;; ++attributes) {
             skipSpace();
-            if (mPos == mEnd)
+            if (m_pos == m_end)
                 return false;
-            if (*mPos == '>') {
-                ++mPos;
-                ++mDepth;
+            if (*m_pos == '>') {
+                ++m_pos;
+                ++m_depth;
                 return true;
             }
-            if (*mPos == '/') {
-                ++mPos;
-                return mPos != mEnd && *mPos++ == '>';
+            if (*m_pos == '/') {
+                ++m_pos;
+                return m_pos != m_end && *m_pos++ == '>';
             }
             if (attributes == XmlFileGuard::MAX_ATTRIBUTES || !scanAttribute())
                 return false;
@@ -223,35 +223,35 @@ private:
 
     bool scanAttribute()
     {
-        if (!isNameStart(*mPos))
+        if (!isNameStart(*m_pos))
             return false;
-        while (mPos != mEnd && isNameChar(*mPos))
-            ++mPos;
+        while (m_pos != m_end && isNameChar(*m_pos))
+            ++m_pos;
         skipSpace();
-        if (mPos == mEnd || *mPos != '=')
+        if (m_pos == m_end || *m_pos != '=')
             return false;
-        ++mPos;
+        ++m_pos;
         skipSpace();
-        if (mPos == mEnd)
+        if (m_pos == m_end)
             return false;
-        if (*mPos == '"' || *mPos == '\'') {
-            const char quote = *mPos++;
-            const char* const value = mPos;
-            return skipPast(quote) && hasGoodReferences(value, mPos - 1);
+        if (*m_pos == '"' || *m_pos == '\'') {
+            const char quote = *m_pos++;
+            const char* const value = m_pos;
+            return skipPast(quote) && hasGoodReferences(value, m_pos - 1);
         }
-        while (mPos != mEnd && !isSpace(*mPos) && *mPos != '/' && *mPos != '>') {
-            if (*mPos == '"' || *mPos == '\'')
+        while (m_pos != m_end && !isSpace(*m_pos) && *m_pos != '/' && *m_pos != '>') {
+            if (*m_pos == '"' || *m_pos == '\'')
                 return false;
-            ++mPos;
+            ++m_pos;
         }
         return true;
     }
 
-    const char* mPos;
-    const char* mEnd;
-    bool mHasReferences;
-    int mDepth = 0;
-    bool mIsDone = false;
+    const char* m_pos;
+    const char* m_end;
+    bool m_hasReferences;
+    int m_depth = 0;
+    bool m_isDone = false;
 };
 
 } // namespace

@@ -13,25 +13,25 @@ constexpr int MAX_TRIES = 3;
 } // namespace
 
 WindowPlaceKeeper::WindowPlaceKeeper(QWidget* window)
-    : QObject(window), mWindow(window), mPlace(window->pos())
+    : QObject(window), m_window(window), m_place(window->pos())
 {
     window->installEventFilter(this);
 }
 
 bool WindowPlaceKeeper::eventFilter(QObject* object, QEvent* event)
 {
-    if (object != mWindow)
+    if (object != m_window)
         return false;
     switch (event->type()) {
     case QEvent::Show:
-        mTries = MAX_TRIES;
+        m_tries = MAX_TRIES;
         break;
     case QEvent::Move:
         // The window system moves a window spontaneously, the program does not.
         if (event->spontaneous())
             QMetaObject::invokeMethod(this, &WindowPlaceKeeper::check, Qt::QueuedConnection);
         else
-            mPlace = mWindow->pos();
+            m_place = m_window->pos();
         break;
     case QEvent::WindowActivate: // the window manager has placed the window by now
         check();
@@ -44,10 +44,10 @@ bool WindowPlaceKeeper::eventFilter(QObject* object, QEvent* event)
 
 void WindowPlaceKeeper::check()
 {
-    QWindow* window = mWindow->windowHandle();
-    if (!window || !mWindow->isVisible() || mTries == 0 || window->position() == mPlace)
+    QWindow* window = m_window->windowHandle();
+    if (!window || !m_window->isVisible() || m_tries == 0 || window->position() == m_place)
         return;
-    --mTries;
+    --m_tries;
     // Set it even if the window is already there: the window manager replies with the true position.
-    window->setPosition(mPlace);
+    window->setPosition(m_place);
 }

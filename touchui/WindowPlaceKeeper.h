@@ -25,7 +25,7 @@ public:
 private:
     void check();
 
-    QWidget* mWindow;
-    QPoint mPlace; // the position set by the program, global
-    int mTries = 0;
+    QWidget* m_window;
+    QPoint m_place; // the position set by the program, global
+    int m_tries = 0;
 };

@@ -33,8 +33,8 @@ public:
                 continue;
             main->addReceiver(new Recorder(1, *this));
             subPanel->addReceiver(new Recorder(3, *this));
-            mMain = std::move(main);
-            mSubPanel = std::move(subPanel);
+            m_main = std::move(main);
+            m_subPanel = std::move(subPanel);
             return true;
         }
         return false;
@@ -43,9 +43,9 @@ public:
     // Returns the method ids called on the service, in their order.
     QList<long> methodsOf(long service) const
     {
-        const std::lock_guard lock(mMutex);
+        const std::lock_guard lock(m_mutex);
         QList<long> methods;
-        for (const SiblingCall& call : mCalls)
+        for (const SiblingCall& call : m_calls)
             if (call.service == service)
                 methods << call.method;
         return methods;
@@ -56,8 +56,8 @@ public:
     // Returns the packed arguments of the last call of the method; empty when it was not called.
     QByteArray lastArguments(long service, long method) const
     {
-        const std::lock_guard lock(mMutex);
-        for (auto call = mCalls.crbegin(); call != mCalls.crend(); ++call)
+        const std::lock_guard lock(m_mutex);
+        for (auto call = m_calls.crbegin(); call != m_calls.crend(); ++call)
             if (call->service == service && call->method == method)
                 return call->data;
         return {};
@@ -66,9 +66,9 @@ public:
     // Returns the packed arguments of every call of the method, in their order.
     QList<QByteArray> argumentsOf(long service, long method) const
     {
-        const std::lock_guard lock(mMutex);
+        const std::lock_guard lock(m_mutex);
         QList<QByteArray> arguments;
-        for (const SiblingCall& call : mCalls)
+        for (const SiblingCall& call : m_calls)
             if (call.service == service && call.method == method)
                 arguments << call.data;
         return arguments;
@@ -76,8 +76,8 @@ public:
 
     void forget()
     {
-        const std::lock_guard lock(mMutex);
-        mCalls.clear();
+        const std::lock_guard lock(m_mutex);
+        m_calls.clear();
     }
 
 private:
@@ -89,25 +89,25 @@ private:
     class Recorder : public PTC::Receiver
     {
     public:
-        Recorder(long id, Siblings& siblings) : Receiver(id), mSiblings(siblings) {}
+        Recorder(long id, Siblings& siblings) : Receiver(id), m_siblings(siblings) {}
         void recv(PTC::Event* event) override
         {
             {
-                const std::lock_guard lock(mSiblings.mMutex);
-                mSiblings.mCalls << SiblingCall{event->getObjectId(), event->getMethodId(),
-                                                QByteArray(static_cast<const char*>(event->getData()),
-                                                           static_cast<qsizetype>(event->getSize()))};
+                const std::lock_guard lock(m_siblings.m_mutex);
+                m_siblings.m_calls << SiblingCall{event->getObjectId(), event->getMethodId(),
+                                                  QByteArray(static_cast<const char*>(event->getData()),
+                                                             static_cast<qsizetype>(event->getSize()))};
             }
             delete[] static_cast<char*>(event->getData());
             delete event;
         }
 
     private:
-        Siblings& mSiblings;
+        Siblings& m_siblings;
     };
 
-    mutable std::mutex mMutex;
-    QList<SiblingCall> mCalls;
-    std::unique_ptr<SocketRemoteReceiver> mMain;
-    std::unique_ptr<SocketRemoteReceiver> mSubPanel;
+    mutable std::mutex m_mutex;
+    QList<SiblingCall> m_calls;
+    std::unique_ptr<SocketRemoteReceiver> m_main;
+    std::unique_ptr<SocketRemoteReceiver> m_subPanel;
 };

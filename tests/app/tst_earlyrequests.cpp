@@ -23,22 +23,22 @@ private:
     static EarlyRequests& requests() { return *EarlyRequests::getInstance(); }
     void ask(int number)
     {
-        requests().carryOut([this, number] { mDone << number; });
+        requests().carryOut([this, number] { m_done << number; });
     }
 
-    QList<int> mDone;
+    QList<int> m_done;
 };
 
 void tst_earlyrequests::cleanup()
 {
     EarlyRequests::clearInstance();
-    mDone.clear();
+    m_done.clear();
 }
 
 void tst_earlyrequests::atOnceWithoutHandShakes()
 {
     ask(1);
-    QCOMPARE(mDone, QList{1});
+    QCOMPARE(m_done, QList{1});
 }
 
 void tst_earlyrequests::afterTheLastHandShakeInTheirOrder()
@@ -49,11 +49,11 @@ void tst_earlyrequests::afterTheLastHandShakeInTheirOrder()
     requests().clientIdCame(65);
     ask(2);
     QCoreApplication::processEvents();
-    QVERIFY(mDone.isEmpty());
+    QVERIFY(m_done.isEmpty());
     requests().clientIdCame(36);
-    QTRY_COMPARE(mDone, QList({1, 2}));
+    QTRY_COMPARE(m_done, QList({1, 2}));
     ask(3);
-    QCOMPARE(mDone, QList({1, 2, 3}));
+    QCOMPARE(m_done, QList({1, 2, 3}));
 }
 
 void tst_earlyrequests::whatComesMeanwhileStaysBehind()
@@ -63,7 +63,7 @@ void tst_earlyrequests::whatComesMeanwhileStaysBehind()
     ask(2);
     requests().clientIdCame(65);
     ask(3);
-    QTRY_COMPARE(mDone, QList({1, 2, 3}));
+    QTRY_COMPARE(m_done, QList({1, 2, 3}));
 }
 
 void tst_earlyrequests::aDialogHoldsNoOtherUp()
@@ -71,26 +71,26 @@ void tst_earlyrequests::aDialogHoldsNoOtherUp()
     requests().expectClientId(65);
     QEventLoop dialog;
     requests().carryOut([this, &dialog] {
-        mDone << 1;
+        m_done << 1;
         dialog.exec();
-        mDone << 4;
+        m_done << 4;
     });
     ask(2);
     requests().carryOut([this, &dialog] {
-        mDone << 3;
+        m_done << 3;
         dialog.quit();
     });
     requests().clientIdCame(65);
-    QTRY_COMPARE(mDone, QList({1, 2, 3, 4}));
+    QTRY_COMPARE(m_done, QList({1, 2, 3, 4}));
 }
 
 void tst_earlyrequests::aSilentServiceHoldsNothingUpForEver()
 {
     requests().expectClientId(71);
     ask(1);
-    QTRY_COMPARE_WITH_TIMEOUT(mDone, QList{1}, 12 * EarlyRequests::PATIENCE.count() * 1000);
+    QTRY_COMPARE_WITH_TIMEOUT(m_done, QList{1}, 12 * EarlyRequests::PATIENCE.count() * 1000);
     ask(2);
-    QCOMPARE(mDone, QList({1, 2}));
+    QCOMPARE(m_done, QList({1, 2}));
 }
 
 void tst_earlyrequests::aFloodIsCutOff()
@@ -99,8 +99,8 @@ void tst_earlyrequests::aFloodIsCutOff()
     for (int i = 0; i < 10 * EarlyRequests::MAX_KEPT; ++i)
         ask(i);
     requests().clientIdCame(65);
-    QTRY_COMPARE(mDone.size(), EarlyRequests::MAX_KEPT);
-    QCOMPARE(mDone.last(), EarlyRequests::MAX_KEPT - 1);
+    QTRY_COMPARE(m_done.size(), EarlyRequests::MAX_KEPT);
+    QCOMPARE(m_done.last(), EarlyRequests::MAX_KEPT - 1);
 }
 
 void tst_earlyrequests::unknownHandShakes()
@@ -110,9 +110,9 @@ void tst_earlyrequests::unknownHandShakes()
     requests().expectClientId(65);
     requests().clientIdCame(36);
     ask(1);
-    QVERIFY(mDone.isEmpty());
+    QVERIFY(m_done.isEmpty());
     requests().clientIdCame(65);
-    QTRY_COMPARE(mDone, QList{1});
+    QTRY_COMPARE(m_done, QList{1});
 }
 
 QTEST_GUILESS_MAIN(tst_earlyrequests)

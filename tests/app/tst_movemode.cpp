@@ -23,42 +23,42 @@ private Q_SLOTS:
 private:
     std::unique_ptr<QEvent> event(QEvent::Type type, const QPointF& global) const;
 
-    std::unique_ptr<QWidget> mWindow;
-    std::unique_ptr<MoveMode> mMode;
-    QWidget* mList = nullptr;
-    TouchDevice mDevice;
+    std::unique_ptr<QWidget> m_window;
+    std::unique_ptr<MoveMode> m_mode;
+    QWidget* m_list = nullptr;
+    TouchDevice m_device;
 };
 
 void tst_movemode::init()
 {
-    mWindow = std::make_unique<QWidget>();
-    mWindow->setGeometry(100, 100, 600, 500);
-    mMode = std::make_unique<MoveMode>(mWindow.get());
-    mMode->button()->move(300, 10);
-    mList = new QWidget(mWindow.get());
-    mList->setGeometry(10, 100, 200, 300);
+    m_window = std::make_unique<QWidget>();
+    m_window->setGeometry(100, 100, 600, 500);
+    m_mode = std::make_unique<MoveMode>(m_window.get());
+    m_mode->button()->move(300, 10);
+    m_list = new QWidget(m_window.get());
+    m_list->setGeometry(10, 100, 200, 300);
 }
 
 void tst_movemode::buttonFollowsTheMode()
 {
-    const KSPushbutton* button = mMode->button();
-    QVERIFY(!mMode->isOn());
+    const KSPushbutton* button = m_mode->button();
+    QVERIFY(!m_mode->isOn());
     QCOMPARE(button->text(), QStringLiteral("Move"));
-    mMode->showPressed();
+    m_mode->showPressed();
     QCOMPARE(button->buttonState(), KSPushbutton::ButtonPressed);
-    mMode->showReleased();
+    m_mode->showReleased();
     QCOMPARE(button->buttonState(), KSPushbutton::ButtonRest);
 
-    mMode->setOn(true);
-    QVERIFY(mMode->isOn());
+    m_mode->setOn(true);
+    QVERIFY(m_mode->isOn());
     QCOMPARE(button->text(), QStringLiteral("Done"));
     QCOMPARE(button->buttonState(), KSPushbutton::ButtonSelectedRest);
-    mMode->showPressed();
+    m_mode->showPressed();
     QCOMPARE(button->buttonState(), KSPushbutton::ButtonSelectedPressed);
-    mMode->showReleased();
+    m_mode->showReleased();
     QCOMPARE(button->buttonState(), KSPushbutton::ButtonSelectedRest);
 
-    mMode->setOn(false);
+    m_mode->setOn(false);
     QCOMPARE(button->text(), QStringLiteral("Move"));
     QCOMPARE(button->buttonState(), KSPushbutton::ButtonRest);
 }
@@ -69,7 +69,7 @@ std::unique_ptr<QEvent> tst_movemode::event(QEvent::Type type, const QPointF& gl
     case QEvent::TouchBegin:
     case QEvent::TouchEnd:
         return std::make_unique<QTouchEvent>(
-            type, mDevice, Qt::NoModifier,
+            type, m_device, Qt::NoModifier,
             QList<QEventPoint>{QEventPoint(0, QEventPoint::Pressed, global, global)});
     case QEvent::Wheel:
         return std::make_unique<QWheelEvent>(global, global, QPoint(), QPoint(0, 120), Qt::NoButton,
@@ -109,17 +109,17 @@ void tst_movemode::endsWithPressesBesideTheList()
     QFETCH(QEvent::Type, type);
     QFETCH(QPoint, place);
     QFETCH(bool, isToButton);
-    mMode->setOn(isOn);
-    const std::unique_ptr<QEvent> sent = event(type, mWindow->mapToGlobal(place));
-    const QObject* receiver = isToButton ? static_cast<QObject*>(mMode->button()) : mWindow.get();
-    QTEST(mMode->isEndedBy(receiver, sent.get(), mList), "ends");
+    m_mode->setOn(isOn);
+    const std::unique_ptr<QEvent> sent = event(type, m_window->mapToGlobal(place));
+    const QObject* receiver = isToButton ? static_cast<QObject*>(m_mode->button()) : m_window.get();
+    QTEST(m_mode->isEndedBy(receiver, sent.get(), m_list), "ends");
 }
 
 void tst_movemode::touchWithoutPointsEndsNothing()
 {
-    mMode->setOn(true);
-    const QTouchEvent touch(QEvent::TouchBegin, mDevice, Qt::NoModifier, QList<QEventPoint>());
-    QVERIFY(!mMode->isEndedBy(mWindow.get(), &touch, mList));
+    m_mode->setOn(true);
+    const QTouchEvent touch(QEvent::TouchBegin, m_device, Qt::NoModifier, QList<QEventPoint>());
+    QVERIFY(!m_mode->isEndedBy(m_window.get(), &touch, m_list));
 }
 
 QTEST_MAIN(tst_movemode)

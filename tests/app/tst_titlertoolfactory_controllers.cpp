@@ -42,7 +42,7 @@ class tst_titlertoolfactory_controllers : public QObject
 private Q_SLOTS:
     void initTestCase();
     void cleanupTestCase();
-    void init() { mSiblings.forget(); }
+    void init() { m_siblings.forget(); }
 
     void factoryKnowsOnlyItsServices();
     void adapterIdsNeverGoBack();
@@ -66,45 +66,45 @@ private Q_SLOTS:
     void showTitlerIsMode1();
 
 private:
-    Siblings mSiblings;
-    std::unique_ptr<TitlerToolFactory> mFactory;
+    Siblings m_siblings;
+    std::unique_ptr<TitlerToolFactory> m_factory;
 };
 
 void tst_titlertoolfactory_controllers::initTestCase()
 {
-    QVERIFY(mSiblings.listenOnFreePorts());
+    QVERIFY(m_siblings.listenOnFreePorts());
     // Without the services a message has nowhere to go.
     messagesWithoutServiceAreLost();
 
-    mFactory = std::make_unique<TitlerToolFactory>();
-    QVERIFY(mFactory->initialize());
-    ShowTitlerController::getInstance()->setFactory(mFactory.get());
-    EditTitlerController::getInstance()->setFactory(mFactory.get());
-    ShowMessageController::getInstance()->setFactory(mFactory.get());
-    TitlerPowerController::getInstance()->setFactory(mFactory.get());
-    TitlerProjectDataController::getInstance()->setFactory(mFactory.get());
-    TitlerAPPEventFilterController::getInstance()->initialize(mFactory.get());
+    m_factory = std::make_unique<TitlerToolFactory>();
+    QVERIFY(m_factory->initialize());
+    ShowTitlerController::getInstance()->setFactory(m_factory.get());
+    EditTitlerController::getInstance()->setFactory(m_factory.get());
+    ShowMessageController::getInstance()->setFactory(m_factory.get());
+    TitlerPowerController::getInstance()->setFactory(m_factory.get());
+    TitlerProjectDataController::getInstance()->setFactory(m_factory.get());
+    TitlerAPPEventFilterController::getInstance()->initialize(m_factory.get());
     for (const auto& [service, method] : QList<std::pair<long, long>>{{SHOW_TITLER, 2},
                                                                       {FILE_MANAGER, 78},
                                                                       {MESSAGE_CENTER, 8},
                                                                       {POWER_MANAGER, 7},
                                                                       {PROJECT_DATA, 9},
                                                                       {APP_EVENT_FILTER, 6}})
-        QTRY_COMPARE(mSiblings.methodsOf(service), Methods{method});
+        QTRY_COMPARE(m_siblings.methodsOf(service), Methods{method});
 
     EditTitlerController::getInstance()->getClientID(11);
     ShowMessageController::getInstance()->setClientID(12);
     TitlerProjectDataController::getInstance()->getClientID(14);
     TitlerAPPEventFilterController::getInstance()->setClientID(15);
-    QTRY_COMPARE(mSiblings.methodsOf(FILE_MANAGER), Methods({78, 79}));
-    QTRY_COMPARE(mSiblings.methodsOf(MESSAGE_CENTER), Methods({8, 9}));
-    QTRY_COMPARE(mSiblings.methodsOf(PROJECT_DATA), Methods({9, 10}));
-    QTRY_COMPARE(mSiblings.methodsOf(APP_EVENT_FILTER), Methods({6, 7}));
+    QTRY_COMPARE(m_siblings.methodsOf(FILE_MANAGER), Methods({78, 79}));
+    QTRY_COMPARE(m_siblings.methodsOf(MESSAGE_CENTER), Methods({8, 9}));
+    QTRY_COMPARE(m_siblings.methodsOf(PROJECT_DATA), Methods({9, 10}));
+    QTRY_COMPARE(m_siblings.methodsOf(APP_EVENT_FILTER), Methods({6, 7}));
 }
 
 void tst_titlertoolfactory_controllers::cleanupTestCase()
 {
-    mSiblings.forget();
+    m_siblings.forget();
     ShowTitlerController::clearInstance();
     SystemSetupInfoController::clearInstance();
     ShowMessageController::clearInstance();
@@ -114,22 +114,22 @@ void tst_titlertoolfactory_controllers::cleanupTestCase()
     EditTitlerController::clearInstance();
     EarlyRequests::clearInstance();
     // Each took its leave of the service.
-    QTRY_COMPARE(mSiblings.methodsOf(FILE_MANAGER), Methods({33, 34}));
-    mFactory.reset();
+    QTRY_COMPARE(m_siblings.methodsOf(FILE_MANAGER), Methods({33, 34}));
+    m_factory.reset();
 }
 
 void tst_titlertoolfactory_controllers::factoryKnowsOnlyItsServices()
 {
     int untouched = 0;
     void* instance = &untouched;
-    mFactory->createInstance(4711, &instance);
+    m_factory->createInstance(4711, &instance);
     QCOMPARE(instance, static_cast<void*>(&untouched));
-    QVERIFY(!mFactory->createAdapter(4711, nullptr, nullptr));
-    QVERIFY(!mFactory->createProxy(117, 1, 1000));
-    QVERIFY(!mFactory->createProxy(118, 1, 1005)); // nobody listens there
+    QVERIFY(!m_factory->createAdapter(4711, nullptr, nullptr));
+    QVERIFY(!m_factory->createProxy(117, 1, 1000));
+    QVERIFY(!m_factory->createProxy(118, 1, 1005)); // nobody listens there
     for (const long stranger : {0L, -1L, 1L, 999L, 1003L, 1009L, 64000L, 1L << 40})
-        QVERIFY(!mFactory->createProxy(118, 1, stranger));
-    std::unique_ptr<PTC::IProxyBase> proxy(mFactory->createProxy(118, 77, 1000));
+        QVERIFY(!m_factory->createProxy(118, 1, stranger));
+    std::unique_ptr<PTC::IProxyBase> proxy(m_factory->createProxy(118, 77, 1000));
     QVERIFY(proxy);
     QCOMPARE(proxy->getId(), 77L);
 }
@@ -137,20 +137,20 @@ void tst_titlertoolfactory_controllers::factoryKnowsOnlyItsServices()
 void tst_titlertoolfactory_controllers::adapterIdsNeverGoBack()
 {
     PTC::Receiver receiver(9);
-    const long first = mFactory->createAdapter(37, &receiver, nullptr)->getId();
+    const long first = m_factory->createAdapter(37, &receiver, nullptr)->getId();
     receiver.removeCBAdapter(first);
-    const long second = mFactory->createAdapter(115, &receiver, nullptr)->getId();
+    const long second = m_factory->createAdapter(115, &receiver, nullptr)->getId();
     QCOMPARE(second, first + 1);
 }
 
 void tst_titlertoolfactory_controllers::setupHandShakeAsksForModelAndLanguages()
 {
     SystemSetupInfoController* setup = SystemSetupInfoController::getInstance();
-    setup->setFactory(mFactory.get());
-    QTRY_COMPARE(mSiblings.methodsOf(SYSTEM_SETUP), Methods{64});
+    setup->setFactory(m_factory.get());
+    QTRY_COMPARE(m_siblings.methodsOf(SYSTEM_SETUP), Methods{64});
     setup->getClientID(10);
-    QTRY_COMPARE(mSiblings.methodsOf(SYSTEM_SETUP), Methods({64, 65, 16, 1}));
-    QCOMPARE(mSiblings.lastArguments(SYSTEM_SETUP, 16), QByteArray(1, '\x0a'));
+    QTRY_COMPARE(m_siblings.methodsOf(SYSTEM_SETUP), Methods({64, 65, 16, 1}));
+    QCOMPARE(m_siblings.lastArguments(SYSTEM_SETUP, 16), QByteArray(1, '\x0a'));
 }
 
 void tst_titlertoolfactory_controllers::setupTellsLanguages()
@@ -180,10 +180,10 @@ void tst_titlertoolfactory_controllers::setupTellsLanguages()
 
 void tst_titlertoolfactory_controllers::setupIgnoresASecondFactory()
 {
-    SystemSetupInfoController::getInstance()->setFactory(mFactory.get());
+    SystemSetupInfoController::getInstance()->setFactory(m_factory.get());
     // Another call shows that nothing was sent before it.
     SystemSetupInfoController::getInstance()->getModuleInfo();
-    QTRY_COMPARE(mSiblings.methodsOf(SYSTEM_SETUP), Methods{16});
+    QTRY_COMPARE(m_siblings.methodsOf(SYSTEM_SETUP), Methods{16});
 }
 
 void tst_titlertoolfactory_controllers::fileManagerReportsFoldersAndTitles()
@@ -195,14 +195,14 @@ void tst_titlertoolfactory_controllers::fileManagerReportsFoldersAndTitles()
     files->changeTitlerFolderName("/t/a", "/t/速報");
     files->updateTitlerOrder("/t/a");
     files->changeTitlerStatus(FileManagerDefine::TITLE_ADDED, "/t/a/1.xml");
-    QTRY_COMPARE(mSiblings.methodsOf(FILE_MANAGER), Methods({75, 76, 73, 74, 77, 72}));
+    QTRY_COMPARE(m_siblings.methodsOf(FILE_MANAGER), Methods({75, 76, 73, 74, 77, 72}));
 
-    QByteArray data = mSiblings.lastArguments(FILE_MANAGER, 74);
+    QByteArray data = m_siblings.lastArguments(FILE_MANAGER, 74);
     FileManagerDefine::tagChangeFolderNameParam renamed;
     FileManagerControllerParams::deserialize_updateTitlerFolderName_param(renamed, data.data(), data.size());
     QCOMPARE(renamed.clientId, 11);
     QCOMPARE(renamed.newPath, std::wstring(L"/t/速報"));
-    data = mSiblings.lastArguments(FILE_MANAGER, 72);
+    data = m_siblings.lastArguments(FILE_MANAGER, 72);
     FileManagerDefine::tagTitleChangeStatusParam changed;
     FileManagerControllerParams::deserialize_updateTitlerStatus_param(changed, data.data(), data.size());
     QCOMPARE(changed.changeType, 4);
@@ -216,7 +216,7 @@ void tst_titlertoolfactory_controllers::fileManagerReportsFromOtherThreads()
     }));
     worker->start();
     QVERIFY(worker->wait());
-    QTRY_COMPARE(mSiblings.methodsOf(FILE_MANAGER), Methods{72});
+    QTRY_COMPARE(m_siblings.methodsOf(FILE_MANAGER), Methods{72});
 }
 
 void tst_titlertoolfactory_controllers::importNoticesByFileType()
@@ -285,8 +285,8 @@ void tst_titlertoolfactory_controllers::ownLockEventsHaveNoEffect()
     QCOMPARE(spy.size(), 1);
 
     locks->sendAPPEvent(APPEventDefine::LOCKTYPE_OBJECT, true);
-    QTRY_COMPARE(mSiblings.methodsOf(APP_EVENT_FILTER), Methods{1});
-    QByteArray data = mSiblings.lastArguments(APP_EVENT_FILTER, 1);
+    QTRY_COMPARE(m_siblings.methodsOf(APP_EVENT_FILTER), Methods{1});
+    QByteArray data = m_siblings.lastArguments(APP_EVENT_FILTER, 1);
     APPEventDefine::_tagAPPEvent sent;
     APPEventFilterParams::deserialize_postAPPEventFilter_param(sent, data.data(), data.size());
     QCOMPARE(sent.clientId, 15);
@@ -303,7 +303,7 @@ void tst_titlertoolfactory_controllers::restoreOriginalIsTold()
     QCOMPARE(spy.size(), 0);
     locks->informRestoreOriginal(APPEventDefine::EVENTREVICER_RESTORE_ALL);
     QCOMPARE(spy.size(), 1);
-    QTRY_COMPARE(mSiblings.methodsOf(APP_EVENT_FILTER), Methods({2, 2}));
+    QTRY_COMPARE(m_siblings.methodsOf(APP_EVENT_FILTER), Methods({2, 2}));
     locks->postRestoreOriginalNotify({1, 0, false, APPEventDefine::EVENTREVICER_TITLER});
     QCOMPARE(spy.size(), 1);
     locks->postRestoreOriginalNotify({1, 0, false, APPEventDefine::EVENTREVICER_NONE});
@@ -329,7 +329,7 @@ void tst_titlertoolfactory_controllers::projectLoadAsksForLanguages()
     QFETCH(bool, asks);
     TitlerProjectDataController::getInstance()->loadNotify(state);
     SystemSetupInfoController::getInstance()->getModuleInfo();
-    QTRY_COMPARE(mSiblings.methodsOf(SYSTEM_SETUP), asks ? Methods({1, 16}) : Methods{16});
+    QTRY_COMPARE(m_siblings.methodsOf(SYSTEM_SETUP), asks ? Methods({1, 16}) : Methods{16});
 }
 
 void tst_titlertoolfactory_controllers::powerEventsAreSignals()
@@ -346,8 +346,8 @@ void tst_titlertoolfactory_controllers::powerEventsAreSignals()
 void tst_titlertoolfactory_controllers::messageCarriesItsNumberAndText()
 {
     ShowMessageController::getInstance()->postMessage(MessageDef::MESSAGE_FONT_MISSING, QString("書体"));
-    QTRY_COMPARE(mSiblings.methodsOf(MESSAGE_CENTER), Methods{3});
-    QByteArray data = mSiblings.lastArguments(MESSAGE_CENTER, 3);
+    QTRY_COMPARE(m_siblings.methodsOf(MESSAGE_CENTER), Methods{3});
+    QByteArray data = m_siblings.lastArguments(MESSAGE_CENTER, 3);
     MessageDefine::_tagMessageParam sent;
     MessageCenterParams::deserialize_postMessage_param(sent, data.data(), data.size());
     QCOMPARE(sent.clientId, 12);
@@ -360,9 +360,9 @@ void tst_titlertoolfactory_controllers::messageCarriesItsNumberAndText()
 
 void tst_titlertoolfactory_controllers::messagesWithoutServiceAreLost()
 {
-    if (mFactory) {
+    if (m_factory) {
         // The hand-shake was seen to come after it.
-        QVERIFY(mSiblings.methodsOf(MESSAGE_CENTER).isEmpty());
+        QVERIFY(m_siblings.methodsOf(MESSAGE_CENTER).isEmpty());
         return;
     }
     ShowMessageController::getInstance()->postMessage(MessageDef::MESSAGE_TEXT_OBJECT_LIMIT);
@@ -379,8 +379,8 @@ void tst_titlertoolfactory_controllers::onTopFollowsTheService()
     messages->closeMessageNotify({12, 2, 117});
     QCOMPARE(closed.size(), 1);
     messages->changeTopWindow(MessageDefine::TOP_WINDOW_MAIN);
-    QTRY_COMPARE(mSiblings.methodsOf(MESSAGE_CENTER), Methods{1});
-    QCOMPARE(mSiblings.lastArguments(MESSAGE_CENTER, 1), QByteArray("\x0c\x02"));
+    QTRY_COMPARE(m_siblings.methodsOf(MESSAGE_CENTER), Methods{1});
+    QCOMPARE(m_siblings.lastArguments(MESSAGE_CENTER, 1), QByteArray("\x0c\x02"));
     QVERIFY(messages->getMapData().isEmpty());
 }
 
@@ -401,7 +401,7 @@ void tst_titlertoolfactory_controllers::showTitlerIsMode1()
     QCOMPARE(spy.size(), 1);
     QCOMPARE(spy.first().first().value<titler_paramter>().mode, 1);
     ShowTitlerController::getInstance()->changeFolderStatus({4, L"/t/a"});
-    QTRY_COMPARE(mSiblings.methodsOf(SHOW_TITLER), Methods{1});
+    QTRY_COMPARE(m_siblings.methodsOf(SHOW_TITLER), Methods{1});
 }
 
 QTEST_MAIN(tst_titlertoolfactory_controllers)

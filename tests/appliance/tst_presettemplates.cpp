@@ -98,8 +98,8 @@ private:
     // The picture of a title with only one of the design's text objects, without a background.
     QImage pictureOf(const SampleTitles::Sample& sample, std::size_t text);
 
-    QTemporaryDir mDir;
-    int mPictures = 0;
+    QTemporaryDir m_dir;
+    int m_pictures = 0;
 };
 
 void tst_presettemplates::eachDesign()
@@ -124,9 +124,9 @@ SampleTitles::Sample tst_presettemplates::fetch()
 
 QImage tst_presettemplates::pictureOf(const SampleTitles::Sample& sample, std::size_t text)
 {
-    const QString stem = QStringLiteral("p%1").arg(++mPictures);
+    const QString stem = QStringLiteral("p%1").arg(++m_pictures);
     Archive title;
-    title.setPath((mDir.path() + QLatin1Char('/') + stem + QStringLiteral(".xml")).toStdString());
+    title.setPath((m_dir.path() + QLatin1Char('/') + stem + QStringLiteral(".xml")).toStdString());
     title.setThumbnailBig((stem + QStringLiteral("_1920.png")).toStdString());
     title.setThumbnailMiddle((stem + QStringLiteral("_960.png")).toStdString());
     title.setThumbnailSmall((stem + QStringLiteral("_240.png")).toStdString());
@@ -136,13 +136,13 @@ QImage tst_presettemplates::pictureOf(const SampleTitles::Sample& sample, std::s
     render.makeThumbnail(&title, true);
     if (!QTest::qWaitFor([&render] { return render.makePictureThreadIsFinished(); }, PATIENCE_MS))
         return {};
-    const QString folder = mDir.path() + QLatin1Char('/');
+    const QString folder = m_dir.path() + QLatin1Char('/');
     return QImage(folder + QString::fromStdString(title.getThumbnailBig()));
 }
 
 void tst_presettemplates::initTestCase()
 {
-    QVERIFY(mDir.isValid());
+    QVERIFY(m_dir.isValid());
     for (const char* family : {"KST", "DFHeiW5-A"})
         QVERIFY2(QFontDatabase::families().contains(QLatin1String(family)), family);
 }

@@ -92,24 +92,24 @@ private Q_SLOTS:
     void aPathThatCannotBeMadeIsReported();
 
 private:
-    QTemporaryDir mDir;
-    QString mBase;
+    QTemporaryDir m_dir;
+    QString m_base;
 };
 
 void tst_titlerprovision::initTestCase()
 {
-    QVERIFY(mDir.isValid());
-    mBase = useDataPath(mDir);
-    QCOMPARE(mBase, mDir.path() + "/defaultuser/");
-    TitlerProvision provision(mBase);
+    QVERIFY(m_dir.isValid());
+    m_base = useDataPath(m_dir);
+    QCOMPARE(m_base, m_dir.path() + "/defaultuser/");
+    TitlerProvision provision(m_base);
     QVERIFY2(provision.writeMissing(), qPrintable(provision.error()));
-    for (const QString& path : tree(mBase).keys())
+    for (const QString& path : tree(m_base).keys())
         QVERIFY2(!path.contains(".making"), qPrintable(path));
 }
 
 void tst_titlerprovision::thePathFileHasEveryNode()
 {
-    QFile file(mBase + "PathInfo.xml");
+    QFile file(m_base + "PathInfo.xml");
     QVERIFY(file.open(QIODevice::ReadOnly));
     QXmlStreamReader xml(&file);
     QMap<QString, QString> paths;
@@ -134,7 +134,7 @@ void tst_titlerprovision::checkersHaveTwoShades()
 {
     for (const QSize& size : {QSize(240, 135), QSize(135, 135)}) {
         const QImage checker(
-            mBase + QString("resources/Templates/checker_%1x%2.png").arg(size.width()).arg(size.height()));
+            m_base + QString("resources/Templates/checker_%1x%2.png").arg(size.width()).arg(size.height()));
         QCOMPARE(checker.size(), size);
         QVERIFY(checker.pixel(0, 0) != checker.pixel(15, 0));
         QCOMPARE(checker.pixel(0, 0), checker.pixel(15, 15));
@@ -145,7 +145,7 @@ void tst_titlerprovision::checkersHaveTwoShades()
 void tst_titlerprovision::checkerIsThatOfTheList()
 {
     Q_INIT_RESOURCE(TitlerToolResource);
-    const QImage saved(mBase + "resources/Templates/checker_240x135.png");
+    const QImage saved(m_base + "resources/Templates/checker_240x135.png");
     const QImage tile(QStringLiteral(":/checker"));
     QVERIFY(!tile.isNull());
     for (int y = 0; y < saved.height(); ++y) {
@@ -158,9 +158,9 @@ void tst_titlerprovision::checkerIsThatOfTheList()
 
 void tst_titlerprovision::sampleTitlesAreWhole()
 {
-    const auto titles = titlesOf(mBase + "resources/Titles/Welcome");
+    const auto titles = titlesOf(m_base + "resources/Titles/Welcome");
     QCOMPARE(titles.size(), std::size_t(4));
-    QCOMPARE(titlesOf(mBase + QString::fromUtf8("resources/Titles/天气")).size(), std::size_t(2));
+    QCOMPARE(titlesOf(m_base + QString::fromUtf8("resources/Titles/天气")).size(), std::size_t(2));
     for (const auto& title : titles) {
         const QString folder = QFileInfo(QString::fromStdString(title->getPath())).path() + '/';
         const auto picture = [&folder](const std::string& name) {
@@ -180,7 +180,7 @@ void tst_titlerprovision::sampleTitlesAreWhole()
 
 void tst_titlerprovision::samplesShowFourScriptsAnOutlineAndAShadow()
 {
-    const auto titles = titlesOf(mBase + "resources/Titles/Welcome");
+    const auto titles = titlesOf(m_base + "resources/Titles/Welcome");
     QStringList families;
     for (const TText* text : titles.at(1)->text()) {
         families << QString::fromStdString(text->textItems().at(0)->getFontFamily());
@@ -194,7 +194,7 @@ void tst_titlerprovision::samplesShowFourScriptsAnOutlineAndAShadow()
     QCOMPARE(first.at(1)->getText(), std::string("晚间新闻"));
 
     // The text is in the picture: it differs from the background where the text stands.
-    const QString folder = mBase + "resources/Titles/Welcome/";
+    const QString folder = m_base + "resources/Titles/Welcome/";
     const QImage shown(folder + QString::fromStdString(titles.at(0)->getThumbnailBig()));
     const QImage background(folder + QString::fromStdString(titles.at(0)->getBgResourceBig()));
     const QRect text(30, 780, 1000, 280);
@@ -209,7 +209,7 @@ void tst_titlerprovision::templatesAreReadInBothLanguages()
 {
     for (const bool chinese : {false, true}) {
         const QString set = chinese ? "templates_chs" : "templates_en";
-        const auto templates = titlesOf(mBase + "resources/Templates/" + set);
+        const auto templates = titlesOf(m_base + "resources/Templates/" + set);
         const auto samples = PresetTemplates::samples(chinese);
         QCOMPARE(templates.size(), samples.size());
         for (std::size_t i = 0; i < samples.size(); ++i) {
@@ -260,7 +260,7 @@ void tst_titlerprovision::itIsTheSameEveryTime()
     const QString base = useDataPath(dir);
     QVERIFY(TitlerProvision(base).writeMissing());
     const QMap<QString, QByteArray> other = tree(base);
-    const QMap<QString, QByteArray> first = tree(mBase);
+    const QMap<QString, QByteArray> first = tree(m_base);
     QCOMPARE(other.keys(), first.keys());
     for (auto file = first.cbegin(); file != first.cend(); ++file) {
         if (file.key().endsWith(".png")) {

@@ -25,11 +25,11 @@ private:
     {
         QImage image(64, 36, QImage::Format_RGB32);
         image.fill(colour);
-        const QString path = mFolder.filePath(name);
+        const QString path = m_folder.filePath(name);
         return image.save(path, "BMP") ? path : QString();
     }
 
-    QTemporaryDir mFolder;
+    QTemporaryDir m_folder;
 };
 
 void tst_backgroundpicture::itemsOfOneFileShareItsPicture()
@@ -44,7 +44,7 @@ void tst_backgroundpicture::itemsOfOneFileShareItsPicture()
 void tst_backgroundpicture::copiesShareThePicture()
 {
     const QString path = write(QStringLiteral("source.bmp"), Qt::green);
-    const QString copy = mFolder.filePath(QStringLiteral("copy.bmp"));
+    const QString copy = m_folder.filePath(QStringLiteral("copy.bmp"));
     QVERIFY(QFile::copy(path, copy));
     const GraphicsPixmap first(path);
     const GraphicsPixmap second(copy);
@@ -92,8 +92,8 @@ void tst_backgroundpicture::decodedElsewhereIsTheSame()
 
 void tst_backgroundpicture::unreadableIsEmpty()
 {
-    QVERIFY(BackgroundPicture::load(mFolder.filePath(QStringLiteral("missing.png")))->pixmap().isNull());
-    QVERIFY(BackgroundPicture::load(mFolder.path())->pixmap().isNull());
+    QVERIFY(BackgroundPicture::load(m_folder.filePath(QStringLiteral("missing.png")))->pixmap().isNull());
+    QVERIFY(BackgroundPicture::load(m_folder.path())->pixmap().isNull());
     QVERIFY(BackgroundPicture::load(QString())->pixmap().isNull());
 }
 

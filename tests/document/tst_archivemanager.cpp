@@ -29,15 +29,15 @@ class tst_archivemanager : public QObject
 private Q_SLOTS:
     void init()
     {
-        mRoot = std::make_unique<QTemporaryDir>();
-        QVERIFY(mRoot->path().size() < 90);
-        qputenv("K2SYS_AC_DATA", mRoot->path().toUtf8());
+        m_root = std::make_unique<QTemporaryDir>();
+        QVERIFY(m_root->path().size() < 90);
+        qputenv("K2SYS_AC_DATA", m_root->path().toUtf8());
         qputenv("K2SYS_AC_ROOT", "");
-        QVERIFY(QDir(mRoot->path()).mkpath("defaultuser/titles/新闻 é"));
+        QVERIFY(QDir(m_root->path()).mkpath("defaultuser/titles/新闻 é"));
         write(base("PathInfo.xml"), "<p><TitleResource path=\"titles\"/><SystemSetting path=\"settings\"/>"
                                     "<Template path=\"templates\"/><TitlerTemplate path=\"usertemplates\"/>"
                                     "<Font path=\"fonts\"/></p>");
-        mFolder = base("titles/新闻 é");
+        m_folder = base("titles/新闻 é");
     }
 
     void cleanup()
@@ -53,15 +53,15 @@ private Q_SLOTS:
         QCOMPARE(manager, ArchiveManager::getInstance());
         QCOMPARE(manager->getTitleRootFolderPath(), base("titles").toStdString());
         QVERIFY(QDir(base("titles")).mkdir(".hidden"));
-        QCOMPARE(manager->getArchiveFolderList(), std::vector<std::string>{mFolder.toStdString()});
+        QCOMPARE(manager->getArchiveFolderList(), std::vector<std::string>{m_folder.toStdString()});
         makeTitle("a");
-        manager->createNewOrderXML(mFolder.toStdString());
+        manager->createNewOrderXML(m_folder.toStdString());
         const auto all = manager->getAllArchives();
         QCOMPARE(all.size(), std::size_t(1));
         QCOMPARE(all[0]->getName(), std::string("a"));
         qDeleteAll(all);
         ArchiveController controller;
-        QCOMPARE(controller.getFolderList(), QList<std::string>{mFolder.toStdString()});
+        QCOMPARE(controller.getFolderList(), QList<std::string>{m_folder.toStdString()});
         QVERIFY(controller.getArchiveList("").isEmpty());
     }
 
@@ -129,22 +129,22 @@ private Q_SLOTS:
     {
         makeTitle("kept");
         write(file("kept_1920.png"), "picture");
-        QVERIFY(QDir(mFolder).mkpath("sub"));
+        QVERIFY(QDir(m_folder).mkpath("sub"));
         const QString outside = base("outside.png");
         write(outside, "of another folder");
         Archive archive;
         archive.setPath(file("foreign.xml").toStdString());
-        archive.setThumbnailBig("../" + QFileInfo(mFolder).fileName().toStdString() + "/kept_1920.png");
+        archive.setThumbnailBig("../" + QFileInfo(m_folder).fileName().toStdString() + "/kept_1920.png");
         archive.setThumbnailMiddle("kept.xml");
         archive.setThumbnailBlack(".order.xml");
-        archive.setThumbnailSmall(QDir(mFolder).relativeFilePath(outside).toStdString());
+        archive.setThumbnailSmall(QDir(m_folder).relativeFilePath(outside).toStdString());
         archive.setBgResource("sub/");
         archive.setBgResourceBig("..");
         ArchiveManager* const manager = ArchiveManager::getInstance();
         QCOMPARE(manager->saveArchive(&archive), 1);
         QVERIFY(FileSyncQueue::flush(std::chrono::seconds(30)));
         setOrder({"kept.xml"});
-        ArchiveController().deleteUnusefulArchives(mFolder);
+        ArchiveController().deleteUnusefulArchives(m_folder);
         QCOMPARE(entries(), QStringList({".order.xml", "kept.xml", "kept_1920.png", "sub"}));
         QVERIFY(QFile::exists(outside));
         QVERIFY(QFileInfo(file("sub")).isDir());
@@ -153,16 +153,16 @@ private Q_SLOTS:
     void orderRowsStayInTheirFolder()
     {
         makeTitle("kept");
-        QVERIFY(QDir(mRoot->path()).mkpath("elsewhere"));
-        QVERIFY(QFile::copy(file("kept.xml"), mRoot->filePath("elsewhere/foreign.xml")));
-        QVERIFY(QDir(mRoot->path()).mkpath("defaultuser/titles/other"));
+        QVERIFY(QDir(m_root->path()).mkpath("elsewhere"));
+        QVERIFY(QFile::copy(file("kept.xml"), m_root->filePath("elsewhere/foreign.xml")));
+        QVERIFY(QDir(m_root->path()).mkpath("defaultuser/titles/other"));
         QVERIFY(QFile::copy(file("kept.xml"), base("titles/other/next.xml")));
-        QVERIFY(QFile::link(mRoot->filePath("elsewhere/foreign.xml"), file("link.xml")));
-        QVERIFY(QFile::link(mRoot->filePath("elsewhere"), file("sub")));
+        QVERIFY(QFile::link(m_root->filePath("elsewhere/foreign.xml"), file("link.xml")));
+        QVERIFY(QFile::link(m_root->filePath("elsewhere"), file("sub")));
         QVERIFY(QFile::link(base("titles/other/next.xml"), file("inside.xml")));
         setOrder({"../../../elsewhere/foreign.xml", "link.xml", "kept.xml", "sub/foreign.xml",
                   "../other/next.xml", "inside.xml"});
-        const QList<Archive*> titles = ArchiveController().getArchiveList(mFolder);
+        const QList<Archive*> titles = ArchiveController().getArchiveList(m_folder);
         QStringList names;
         for (const Archive* title : titles)
             names.append(QString::fromStdString(title->getName()));
@@ -170,7 +170,7 @@ private Q_SLOTS:
         QCOMPARE(names, QStringList({"kept", "inside"}));
         // A row that is too short for a title takes the other way of reading.
         setOrder({"x", "../../../elsewhere/foreign.xml", "kept.xml"});
-        const QList<Archive*> others = ArchiveController().getArchiveList(mFolder);
+        const QList<Archive*> others = ArchiveController().getArchiveList(m_folder);
         QCOMPARE(others.size(), 1);
         qDeleteAll(others);
     }
@@ -204,7 +204,7 @@ private Q_SLOTS:
         name.replace("%1", base("").chopped(1));
         for (const char* folder : {"templates", "usertemplates/T", "titles/other", "titles2"})
             QVERIFY(QDir(base("")).mkpath(folder));
-        QVERIFY(QDir(mFolder).mkpath("sub"));
+        QVERIFY(QDir(m_folder).mkpath("sub"));
         for (const QString& picture :
              {file("bg.png"), file("sub/bg.png"), base("titles/other/bg.png"), base("templates/bg.png"),
               base("usertemplates/T/bg.png"), base("outside.png"), base("titles2/bg.png")})
@@ -262,7 +262,7 @@ private Q_SLOTS:
         QCOMPARE(manager->saveArchive(&archive), 1);
         QVERIFY(FileSyncQueue::flush(std::chrono::seconds(30)));
         QCOMPARE(manager->deleteArchive(archive.getPath()), 1);
-        QVERIFY(QFileInfo(mFolder).isDir());
+        QVERIFY(QFileInfo(m_folder).isDir());
         QCOMPARE(entries(), QStringList());
     }
 
@@ -270,14 +270,14 @@ private Q_SLOTS:
     {
         ArchiveManager* const manager = ArchiveManager::getInstance();
         QCOMPARE(manager->setArchivesSortUnderFolder("", {}), 0);
-        QCOMPARE(manager->createNewOrderXML(mFolder.toStdString()), 1);
+        QCOMPARE(manager->createNewOrderXML(m_folder.toStdString()), 1);
         QVERIFY(read(file(".order.xml")).contains("index-count=\"0\""));
         makeTitle("标题");
         write(file("b.XML"), "x");
         write(file("c.xml.bak"), "x");
         write(file("d.xml.XML"), "x");
-        QCOMPARE(manager->createNewOrderXML(mFolder.toStdString()), 1);
-        auto rows = manager->getArchivesSortUnderFolder(mFolder.toStdString());
+        QCOMPARE(manager->createNewOrderXML(m_folder.toStdString()), 1);
+        auto rows = manager->getArchivesSortUnderFolder(m_folder.toStdString());
         QStringList names;
         for (const ArchiveOrder* row : rows) {
             QCOMPARE(row->getArchiveIndex(), int(names.size()));
@@ -286,11 +286,11 @@ private Q_SLOTS:
         names.sort();
         QCOMPARE(names, QStringList({"d.xml.XML", "标题.xml"}));
         qDeleteAll(rows);
-        QCOMPARE(manager->getFileListUnderFolder(mFolder.toStdString()).size(), std::size_t(4));
-        QCOMPARE(manager->checkFilesUnderFolder(mFolder.toStdString()), 0);
+        QCOMPARE(manager->getFileListUnderFolder(m_folder.toStdString()).size(), std::size_t(4));
+        QCOMPARE(manager->checkFilesUnderFolder(m_folder.toStdString()), 0);
         write(file(".order.xml"), "<m><index value=\"0\"/></m>");
-        QCOMPARE(manager->checkFilesUnderFolder(mFolder.toStdString()), 1);
-        QCOMPARE(manager->checkFilesUnderFolder(mFolder.toStdString()), 0);
+        QCOMPARE(manager->checkFilesUnderFolder(m_folder.toStdString()), 1);
+        QCOMPARE(manager->checkFilesUnderFolder(m_folder.toStdString()), 0);
         QVERIFY(read(file(".order.xml")).contains("标题.xml"));
     }
 
@@ -298,21 +298,21 @@ private Q_SLOTS:
     {
         ArchiveController controller;
         QVERIFY(controller.getLastFolderPath().isEmpty());
-        QCOMPARE(controller.setLastFolderPath(mFolder), 1);
+        QCOMPARE(controller.setLastFolderPath(m_folder), 1);
         QCOMPARE(controller.setLastArchivePath(file("😀.xml")), 1);
-        QCOMPARE(controller.getLastFolderPath(), mFolder);
+        QCOMPARE(controller.getLastFolderPath(), m_folder);
         QCOMPARE(controller.getLastArchivePath(), file("😀.xml"));
         QCOMPARE(read(base("settings/TitlerLastPathSetting.xml")),
                  QString("<?xml version=\"1.0\" encoding=\"utf-8\" ?>\n<manifest type=\"last-setting\">\n"
                          "    <lastfolder path=\"%1\" />\n    <lastarchive path=\"%2\" />\n</manifest>\n")
-                     .arg(mFolder, file("😀.xml"))
+                     .arg(m_folder, file("😀.xml"))
                      .toUtf8());
     }
 
     void lastSettings()
     {
-        const QString name = mFolder + "/TitlerLastPathSetting.xml";
-        LastSettingParser parser(mFolder.toStdString());
+        const QString name = m_folder + "/TitlerLastPathSetting.xml";
+        LastSettingParser parser(m_folder.toStdString());
         QCOMPARE(parser.getTempAttribute("e", "a"), std::string());
         QVERIFY(parser.editTempFile("last-template", "path", "one"));
         QVERIFY(read(name).contains("type=\"last-setting\""));
@@ -415,7 +415,7 @@ private Q_SLOTS:
         QVERIFY(!controller.saveNewArchive("", &archive));
         QVERIFY(!controller.saveNewArchive(QString(), &archive));
         QVERIFY(!controller.saveNewArchive("x", nullptr));
-        mLog.takeDebugLines();
+        m_log.takeDebugLines();
         QVERIFY(controller.saveNewArchive("x", &archive));
         Archive empty;
         QVERIFY(!controller.saveNewArchive("x", &empty));
@@ -423,7 +423,7 @@ private Q_SLOTS:
         canvas.saveArchiveChange("x", &archive);
         canvas.saveArchiveChange("x", nullptr);
         canvas.saveArchiveChange("", nullptr);
-        QCOMPARE(mLog.takeDebugLines(),
+        QCOMPARE(m_log.takeDebugLines(),
                  QStringList({"[ArchiveController] 200: Save new Archive Success !",
                               "[ArchiveController] 200: Save new Archive Path is invalid !",
                               "[CanvasController] 200: Save Archive Success !",
@@ -432,14 +432,14 @@ private Q_SLOTS:
         QVERIFY(controller.getOneArchive(file("a.xml"), &loaded));
         QVERIFY(!controller.getOneArchive(file("b.xml"), &loaded));
         setOrder({"a.xml"});
-        const QList<Archive*> titles = controller.getArchiveList(mFolder);
+        const QList<Archive*> titles = controller.getArchiveList(m_folder);
         QCOMPARE(titles.size(), 1);
         qDeleteAll(titles);
         setOrder({"a.x"});
-        QVERIFY(controller.getArchiveList(mFolder).isEmpty());
+        QVERIFY(controller.getArchiveList(m_folder).isEmpty());
         // A row that cannot be a title does not take the others with it.
         setOrder({"a.x", "a.xml", ""});
-        const QList<Archive*> others = controller.getArchiveList(mFolder);
+        const QList<Archive*> others = controller.getArchiveList(m_folder);
         QCOMPARE(others.size(), 2);
         QCOMPARE(others[0]->getName(), std::string("a"));
         QCOMPARE(others[0]->getOrder(), std::string("2"));
@@ -456,10 +456,10 @@ private Q_SLOTS:
         b.setArchiveIndex(1);
         b.setArchivePath("a.xml");
         QVERIFY(!controller.saveArchiveListOrder("", {&a}));
-        QVERIFY(controller.saveArchiveListOrder(mFolder, {&a, nullptr, &b}));
-        const auto rows = controller.getFileOrder(mFolder);
+        QVERIFY(controller.saveArchiveListOrder(m_folder, {&a, nullptr, &b}));
+        const auto rows = controller.getFileOrder(m_folder);
         QCOMPARE(rows.size(), std::size_t(2));
-        QVERIFY(controller.getFileOrder(mFolder + "/none").empty());
+        QVERIFY(controller.getFileOrder(m_folder + "/none").empty());
         QCOMPARE(rows[0]->getArchivePath(), std::string("b.xml")); // still there
         QCOMPARE(controller.getTargetFileList(rows, "/f"),
                  std::vector<std::string>({"/f/b.xml", "/f/a.xml"}));
@@ -531,10 +531,10 @@ private Q_SLOTS:
         QFETCH(QStringList, rows);
         QFETCH(QString, expected);
         setOrder(rows);
-        mLog.takeOperations();
+        m_log.takeOperations();
         ArchiveController controller;
-        QCOMPARE(controller.getFreeNameInUserTemplate(mFolder), expected);
-        const QStringList logged = mLog.takeOperations("T");
+        QCOMPARE(controller.getFreeNameInUserTemplate(m_folder), expected);
+        const QStringList logged = m_log.takeOperations("T");
         const bool isAtMax = !rows.isEmpty() && rows.last().contains("999");
         QCOMPARE(logged.contains("300: getFreeNameInUserTemplate() Counter is Max."), isAtMax);
         QCOMPARE(logged.contains("400: getFreeNameInUserTemplate() reach INT_MAX. Exit."),
@@ -544,20 +544,20 @@ private Q_SLOTS:
     void ordersAreRebuiltOnlyWithoutRows()
     {
         ArchiveController controller;
-        QVERIFY(!controller.createNewOrderAccordingToFilesUnderFolder(mFolder));
+        QVERIFY(!controller.createNewOrderAccordingToFilesUnderFolder(m_folder));
         QVERIFY(!QFile::exists(file(".order.xml")));
         makeTitle("a");
         makeTitle("b");
         QVERIFY(QDir(base("titles")).mkdir("empty"));
-        QCOMPARE(controller.reCreateOrderXml(), QList<std::string>{mFolder.toStdString()});
-        QCOMPARE(controller.getFileOrder(mFolder).size(), std::size_t(2));
+        QCOMPARE(controller.reCreateOrderXml(), QList<std::string>{m_folder.toStdString()});
+        QCOMPARE(controller.getFileOrder(m_folder).size(), std::size_t(2));
         setOrder({"b.xml"});
         const QByteArray bytes = read(file(".order.xml"));
-        QVERIFY(!controller.createNewOrderAccordingToFilesUnderFolder(mFolder));
+        QVERIFY(!controller.createNewOrderAccordingToFilesUnderFolder(m_folder));
         QCOMPARE(read(file(".order.xml")), bytes);
         write(file(".order.xml"), bytes.left(bytes.size() / 2));
-        QVERIFY(controller.createNewOrderAccordingToFilesUnderFolder(mFolder));
-        QCOMPARE(controller.getFileOrder(mFolder).size(), std::size_t(2));
+        QVERIFY(controller.createNewOrderAccordingToFilesUnderFolder(m_folder));
+        QCOMPARE(controller.getFileOrder(m_folder).size(), std::size_t(2));
     }
 
     // One could not be read again in an order, and with it none of the others.
@@ -566,17 +566,17 @@ private Q_SLOTS:
         ArchiveController controller;
         makeTitle("a");
         makeTitle("b");
-        const std::string foreign = mFolder.toStdString() + "/caf\xE9.xml";
+        const std::string foreign = m_folder.toStdString() + "/caf\xE9.xml";
         QFile title(file("a.xml"));
         QVERIFY(title.open(QIODevice::ReadOnly));
         std::ofstream(foreign) << title.readAll().toStdString();
-        QCOMPARE(controller.reCreateOrderXml(), QList<std::string>{mFolder.toStdString()});
-        const QList<Archive*> titles = controller.getArchiveList(mFolder);
+        QCOMPARE(controller.reCreateOrderXml(), QList<std::string>{m_folder.toStdString()});
+        const QList<Archive*> titles = controller.getArchiveList(m_folder);
         QCOMPARE(titles.size(), 2);
         qDeleteAll(titles);
         // Nor does it go with what the order does not name.
         setOrder({"b.xml"});
-        controller.deleteUnusefulArchives(mFolder);
+        controller.deleteUnusefulArchives(m_folder);
         QVERIFY(!QFile::exists(file("a.xml")));
         QVERIFY(std::filesystem::exists(foreign));
     }
@@ -585,21 +585,21 @@ private Q_SLOTS:
     {
         FakeTitleChangeReporter reporter;
         ArchiveController controller;
-        controller.deleteUnusefulArchives(mFolder + "/none");
+        controller.deleteUnusefulArchives(m_folder + "/none");
         for (const char* name : {"a", "b", "c"}) {
             makeTitle(name);
             write(file(QString(name) + "_1920.png"), "picture");
         }
         setOrder({"b.xml", "a.xml"});
-        controller.deleteUnusefulArchives(mFolder);
+        controller.deleteUnusefulArchives(m_folder);
         QCOMPARE(entries(), QStringList({".order.xml", "a.xml", "a_1920.png", "b.xml", "b_1920.png"}));
         QCOMPARE(reporter.takePaths(), (QList<std::pair<int, QString>>{{2, file("c.xml")}}));
         // Two mismatches that balance each other out go unnoticed.
         setOrder({"b.xml", "gone.xml"});
-        controller.deleteUnusefulArchives(mFolder);
+        controller.deleteUnusefulArchives(m_folder);
         QVERIFY(QFile::exists(file("a.xml")));
         setOrder({});
-        controller.deleteUnusefulArchives(mFolder);
+        controller.deleteUnusefulArchives(m_folder);
         QCOMPARE(entries(), QStringList{".order.xml"});
         QCOMPARE(reporter.take().size(), 2);
     }
@@ -609,13 +609,13 @@ private Q_SLOTS:
         QVERIFY(!ITitleChangeReporter::instance());
         makeTitle("a");
         setOrder({});
-        ArchiveController().deleteUnusefulArchives(mFolder);
+        ArchiveController().deleteUnusefulArchives(m_folder);
         QCOMPARE(entries(), QStringList{".order.xml"});
     }
 
 private:
-    QString base(const QString& name) const { return mRoot->path() + "/defaultuser/" + name; }
-    QString file(const QString& name) const { return mFolder + '/' + name; }
+    QString base(const QString& name) const { return m_root->path() + "/defaultuser/" + name; }
+    QString file(const QString& name) const { return m_folder + '/' + name; }
 
     void makeTitle(const std::string& name, const std::string& bgResource = {})
     {
@@ -640,10 +640,10 @@ private:
             row.setArchivePath(name.toStdString());
             rows.push_back(row);
         }
-        QCOMPARE(ArchiveManager::getInstance()->setArchivesSortUnderFolder(mFolder.toStdString(), rows), 1);
+        QCOMPARE(ArchiveManager::getInstance()->setArchivesSortUnderFolder(m_folder.toStdString(), rows), 1);
     }
 
-    QStringList entries() const { return settledEntries(mFolder); }
+    QStringList entries() const { return settledEntries(m_folder); }
 
     static QByteArray read(const QString& name)
     {
@@ -658,9 +658,9 @@ private:
             qFatal("cannot write %s", qPrintable(name));
     }
 
-    LogFixture mLog;
-    std::unique_ptr<QTemporaryDir> mRoot;
-    QString mFolder;
+    LogFixture m_log;
+    std::unique_ptr<QTemporaryDir> m_root;
+    QString m_folder;
 };
 
 QTEST_GUILESS_MAIN(tst_archivemanager)

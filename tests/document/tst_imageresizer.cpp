@@ -48,15 +48,15 @@ class tst_imageresizer : public QObject
 private Q_SLOTS:
     void init()
     {
-        mFolder = std::make_unique<QTemporaryDir>();
-        qputenv("K2SYS_AC_DATA", mFolder->path().toUtf8());
+        m_folder = std::make_unique<QTemporaryDir>();
+        qputenv("K2SYS_AC_DATA", m_folder->path().toUtf8());
         qputenv("K2SYS_AC_ROOT", "");
-        QVERIFY(QDir(mFolder->path()).mkpath("defaultuser/resources/Templates"));
-        mChecker = QImage(240, 135, QImage::Format_RGB32);
+        QVERIFY(QDir(m_folder->path()).mkpath("defaultuser/resources/Templates"));
+        m_checker = QImage(240, 135, QImage::Format_RGB32);
         for (int y = 0; y < 135; ++y)
             for (int x = 0; x < 240; ++x)
-                mChecker.setPixel(x, y, (x / 8 + y / 8) % 2 ? 0xFF808080u : 0xFFC0C0C0u);
-        QVERIFY(mChecker.save(checkerPath()));
+                m_checker.setPixel(x, y, (x / 8 + y / 8) % 2 ? 0xFF808080u : 0xFFC0C0C0u);
+        QVERIFY(m_checker.save(checkerPath()));
     }
 
     void cleanup() { QVERIFY(FileSyncQueue::flush(std::chrono::seconds(30))); }
@@ -92,7 +92,7 @@ private Q_SLOTS:
     void writesWhatQtWrites()
     {
         QFETCH(QImage, image);
-        const QString path = mFolder->filePath("画像 é.png");
+        const QString path = m_folder->filePath("画像 é.png");
         QVERIFY(PngWriter::save(image, path));
         const QImage read(path);
         const QImage expected = throughQt(image);
@@ -109,17 +109,17 @@ private Q_SLOTS:
     void otherFormatsAndRefusals()
     {
         const QImage image = pattern(16, 16, QImage::Format_RGB32);
-        QVERIFY(PngWriter::save(image, mFolder->filePath("a.PNG")));
-        QCOMPARE(QImage(mFolder->filePath("a.PNG")), image);
-        QVERIFY(PngWriter::save(image, mFolder->filePath("a.bmp")));
-        QCOMPARE(QImage(mFolder->filePath("a.bmp")), image);
-        QVERIFY(PngWriter::save(image, mFolder->filePath("a.jpg")));
-        QCOMPARE(QImage(mFolder->filePath("a.jpg")).size(), image.size());
-        QVERIFY(!PngWriter::save(image, mFolder->filePath("a.none")));
-        QVERIFY(!PngWriter::save(image, mFolder->filePath("a")));
-        QVERIFY(!PngWriter::save(QImage(), mFolder->filePath("a.bmp")));
-        QCOMPARE(QImage(mFolder->filePath("a.bmp")), image);
-        QVERIFY(!PngWriter::save(image, mFolder->filePath("no/a.png")));
+        QVERIFY(PngWriter::save(image, m_folder->filePath("a.PNG")));
+        QCOMPARE(QImage(m_folder->filePath("a.PNG")), image);
+        QVERIFY(PngWriter::save(image, m_folder->filePath("a.bmp")));
+        QCOMPARE(QImage(m_folder->filePath("a.bmp")), image);
+        QVERIFY(PngWriter::save(image, m_folder->filePath("a.jpg")));
+        QCOMPARE(QImage(m_folder->filePath("a.jpg")).size(), image.size());
+        QVERIFY(!PngWriter::save(image, m_folder->filePath("a.none")));
+        QVERIFY(!PngWriter::save(image, m_folder->filePath("a")));
+        QVERIFY(!PngWriter::save(QImage(), m_folder->filePath("a.bmp")));
+        QCOMPARE(QImage(m_folder->filePath("a.bmp")), image);
+        QVERIFY(!PngWriter::save(image, m_folder->filePath("no/a.png")));
         QVERIFY(!PngWriter::save(image, ""));
         QVERIFY(PngWriter::encode(QImage()).isEmpty());
     }
@@ -141,7 +141,7 @@ private Q_SLOTS:
         QImage source(960, 540, QImage::Format_ARGB32_Premultiplied);
         source.fill(Qt::transparent);
         QVERIFY(resize(source));
-        QCOMPARE(read("small.png"), mChecker);
+        QCOMPARE(read("small.png"), m_checker);
         QImage black(240, 135, QImage::Format_RGB32);
         black.fill(Qt::black);
         QCOMPARE(read("black.png"), black);
@@ -156,7 +156,7 @@ private Q_SLOTS:
             for (int x = 0; x < 240; ++x)
                 reduced.setPixel(x, y, meanOfTwoLines(source, {x, y}));
         QCOMPARE(read("black.png"), reduced.convertToFormat(QImage::Format_RGB32));
-        QImage expected = mChecker;
+        QImage expected = m_checker;
         QPainter(&expected).drawImage(0, 0, reduced);
         QCOMPARE(read("small.png"), expected);
 
@@ -216,26 +216,26 @@ private Q_SLOTS:
         transparent.fill(Qt::transparent);
         QVERIFY(QFile::remove(checkerPath()));
         QVERIFY(!resize(transparent));
-        QVERIFY(QFile::exists(mFolder->filePath("black.png")));
-        QVERIFY(!QFile::exists(mFolder->filePath("small.png")));
+        QVERIFY(QFile::exists(m_folder->filePath("black.png")));
+        QVERIFY(!QFile::exists(m_folder->filePath("small.png")));
         QVERIFY(resize(pattern(960, 540, QImage::Format_RGB32)));
         // A checker with a palette is painted on all the same.
-        QVERIFY(mChecker.convertToFormat(QImage::Format_Indexed8).save(checkerPath()));
+        QVERIFY(m_checker.convertToFormat(QImage::Format_Indexed8).save(checkerPath()));
         QVERIFY(resize(transparent));
-        QCOMPARE(read("small.png").convertToFormat(QImage::Format_RGB32), mChecker);
+        QCOMPARE(read("small.png").convertToFormat(QImage::Format_RGB32), m_checker);
         // One that cannot be read just now is taken as it was.
         QFile torn(checkerPath());
-        QVERIFY(torn.resize(20) && QFile::remove(mFolder->filePath("small.png")));
+        QVERIFY(torn.resize(20) && QFile::remove(m_folder->filePath("small.png")));
         QVERIFY(resize(transparent));
-        QCOMPARE(read("small.png").convertToFormat(QImage::Format_RGB32), mChecker);
+        QCOMPARE(read("small.png").convertToFormat(QImage::Format_RGB32), m_checker);
     }
 
     void availability()
     {
-        QFile text(mFolder->filePath("text.png"));
+        QFile text(m_folder->filePath("text.png"));
         QVERIFY(text.open(QIODevice::WriteOnly) && text.write("no picture") > 0);
         text.close();
-        QVERIFY(PngWriter::save(pattern(12, 34, QImage::Format_RGB32), mFolder->filePath("标题.png")));
+        QVERIFY(PngWriter::save(pattern(12, 34, QImage::Format_RGB32), m_folder->filePath("标题.png")));
         ImageResizer resizer;
         QVERIFY(!resizer.isAvailableImage(path("text.png")));
         QVERIFY(!resizer.isAvailableImage(path("missing.png")));
@@ -265,16 +265,16 @@ private Q_SLOTS:
     void jpeFiles()
     {
         const QImage source = pattern(960, 540, QImage::Format_RGB32);
-        QVERIFY(PngWriter::save(source, mFolder->filePath("source.png")));
+        QVERIFY(PngWriter::save(source, m_folder->filePath("source.png")));
         std::wstring from = path("source.png"), black = path("黑.JPE"), small = path("small.jpe");
-        QFile old(mFolder->filePath("small.jpe"));
+        QFile old(m_folder->filePath("small.jpe"));
         QVERIFY(old.open(QIODevice::WriteOnly) && old.write("old") > 0);
         old.close();
         QVERIFY(ImageResizer().resizeImageToThumbnail(from, black, small, 240, 135));
-        QCOMPARE(QImage(mFolder->filePath("small.jpe"), "jpeg").size(), QSize(240, 135));
-        QCOMPARE(QImage(mFolder->filePath("黑.JPE"), "jpeg").size(), QSize(240, 135));
+        QCOMPARE(QImage(m_folder->filePath("small.jpe"), "jpeg").size(), QSize(240, 135));
+        QCOMPARE(QImage(m_folder->filePath("黑.JPE"), "jpeg").size(), QSize(240, 135));
         QVERIFY(FileSyncQueue::flush(std::chrono::seconds(30)));
-        QCOMPARE(QDir(mFolder->path()).entryList(QDir::Files | QDir::Hidden, QDir::Name),
+        QCOMPARE(QDir(m_folder->path()).entryList(QDir::Files | QDir::Hidden, QDir::Name),
                  QStringList({"small.jpe", "source.png", "黑.JPE"}));
     }
 
@@ -288,12 +288,12 @@ private Q_SLOTS:
     void aChunkOfGigabytesIsNotMadeRoomFor()
     {
         QFETCH(QByteArray, type);
-        QVERIFY(PngWriter::save(pattern(1, 1, QImage::Format_ARGB32), mFolder->filePath("one.png")));
-        QFile file(mFolder->filePath("one.png"));
+        QVERIFY(PngWriter::save(pattern(1, 1, QImage::Format_ARGB32), m_folder->filePath("one.png")));
+        QFile file(m_folder->filePath("one.png"));
         QVERIFY(file.open(QIODevice::ReadOnly));
         QByteArray bytes = file.readAll();
         bytes.insert(33, QByteArray("\x70\0\0\0", 4) + type + QByteArray(200, 'x'));
-        QFile claimed(mFolder->filePath("claimed.png"));
+        QFile claimed(m_folder->filePath("claimed.png"));
         QVERIFY(claimed.open(QIODevice::WriteOnly) && claimed.write(bytes) == bytes.size());
         claimed.close();
         [[maybe_unused]] const qint64 before = peakMemory();
@@ -307,22 +307,22 @@ private Q_SLOTS:
 
     void linksAreReplacedAndNotWrittenThrough()
     {
-        const QString victim = mFolder->filePath("victim");
+        const QString victim = m_folder->filePath("victim");
         QFile file(victim);
         QVERIFY(file.open(QIODevice::WriteOnly) && file.write("kept") == 4);
         file.close();
         const QImage image = pattern(960, 540, QImage::Format_RGB32);
         for (const char* name : {"link.png", "link.jpe"})
-            QVERIFY(QFile::link(victim, mFolder->filePath(name)));
-        QVERIFY(QFile::link(mFolder->filePath("nothing"), mFolder->filePath("dangling.png")));
+            QVERIFY(QFile::link(victim, m_folder->filePath(name)));
+        QVERIFY(QFile::link(m_folder->filePath("nothing"), m_folder->filePath("dangling.png")));
         std::wstring black = path("link.png"), small = path("link.jpe");
         QVERIFY(ImageResizer().resizeImageToThumbnail(image, black, small, 240, 135));
-        QVERIFY(PngWriter::save(image, mFolder->filePath("dangling.png")));
+        QVERIFY(PngWriter::save(image, m_folder->filePath("dangling.png")));
         QVERIFY(file.open(QIODevice::ReadOnly));
         QCOMPARE(file.readAll(), QByteArray("kept"));
-        QVERIFY(!QFile::exists(mFolder->filePath("nothing")));
+        QVERIFY(!QFile::exists(m_folder->filePath("nothing")));
         for (const char* name : {"link.png", "link.jpe", "dangling.png"})
-            QVERIFY(!QFileInfo(mFolder->filePath(name)).isSymLink());
+            QVERIFY(!QFileInfo(m_folder->filePath(name)).isSymLink());
         QCOMPARE(read("link.png").size(), QSize(240, 135));
         QCOMPARE(read("dangling.png").size(), image.size());
     }
@@ -343,22 +343,22 @@ private:
 
     QString checkerPath() const
     {
-        return mFolder->filePath("defaultuser/resources/Templates/checker_240x135.png");
+        return m_folder->filePath("defaultuser/resources/Templates/checker_240x135.png");
     }
 
     std::wstring path(const QString& name) const
     {
-        return mFolder->filePath(name).toStdWString();
+        return m_folder->filePath(name).toStdWString();
     }
 
     QImage read(const QString& name) const
     {
-        return QImage(mFolder->filePath(name));
+        return QImage(m_folder->filePath(name));
     }
 
     bool resize(const QImage& image)
     {
-        if (!PngWriter::save(image, mFolder->filePath("source.png")))
+        if (!PngWriter::save(image, m_folder->filePath("source.png")))
             return false;
         std::wstring source = path("source.png"), black = path("black.png"), small = path("small.png");
         return ImageResizer().resizeImageToThumbnail(source, black, small, 240, 135);
@@ -380,8 +380,8 @@ private:
         return qRgba(red / 8, green / 8, blue / 8, alpha / 8);
     }
 
-    std::unique_ptr<QTemporaryDir> mFolder;
-    QImage mChecker;
+    std::unique_ptr<QTemporaryDir> m_folder;
+    QImage m_checker;
 };
 
 QTEST_MAIN(tst_imageresizer)

@@ -179,10 +179,10 @@ private Q_SLOTS:
 
     void noPictures()
     {
-        const QString pipe = mFolder.filePath("pipe.png");
+        const QString pipe = m_folder.filePath("pipe.png");
         QCOMPARE(mkfifo(pipe.toLocal8Bit().constData(), 0600), 0);
         for (const QString& path :
-             {QString(), mFolder.filePath("missing.png"), mFolder.path(), pipe, QStringLiteral("/dev/zero"),
+             {QString(), m_folder.filePath("missing.png"), m_folder.path(), pipe, QStringLiteral("/dev/zero"),
               write("empty.png", {}), write("text.png", "no picture"),
               write("drawing.svg", "<svg width='9' height='9'/>"),
               write("x.xbm", "#define x_width 8\n#define x_height 1\nstatic char x_bits[] = { 0xff };\n"),
@@ -333,7 +333,7 @@ private Q_SLOTS:
 private:
     QString write(const QString& name, const QByteArray& bytes) const
     {
-        const QString path = mFolder.filePath(name);
+        const QString path = m_folder.filePath(name);
         QFile file(path);
         if (!file.open(QIODevice::WriteOnly) || file.write(bytes) != bytes.size())
             qFatal("cannot write %s", qPrintable(path));
@@ -350,7 +350,7 @@ private:
         QVERIFY(image.sizeInBytes() <= PictureGuard::MAX_DECODED_BYTES);
     }
 
-    QTemporaryDir mFolder;
+    QTemporaryDir m_folder;
 };
 
 QTEST_GUILESS_MAIN(tst_picturereader)

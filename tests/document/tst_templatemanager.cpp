@@ -30,24 +30,24 @@ namespace
 class PrintedText
 {
 public:
-    PrintedText() : mBuffer(std::cout.rdbuf(mText.rdbuf())) {}
-    ~PrintedText() { std::cout.rdbuf(mBuffer); }
-    std::string text() const { return mText.str(); }
+    PrintedText() : m_buffer(std::cout.rdbuf(m_text.rdbuf())) {}
+    ~PrintedText() { std::cout.rdbuf(m_buffer); }
+    std::string text() const { return m_text.str(); }
 
 private:
-    std::ostringstream mText;
-    std::streambuf* mBuffer;
+    std::ostringstream m_text;
+    std::streambuf* m_buffer;
 };
 
 // Takes the rights of the superuser over files from this thread, so that read-only folders are read-only.
 class OrdinaryUser
 {
 public:
-    OrdinaryUser() : mPrevious(::setfsuid(65534)) {}
-    ~OrdinaryUser() { ::setfsuid(static_cast<uid_t>(mPrevious)); }
+    OrdinaryUser() : m_previous(::setfsuid(65534)) {}
+    ~OrdinaryUser() { ::setfsuid(static_cast<uid_t>(m_previous)); }
 
 private:
-    int mPrevious;
+    int m_previous;
 };
 
 std::vector<std::unique_ptr<Archive>> own(const std::vector<Archive*>& templates)
@@ -72,7 +72,7 @@ class tst_templatemanager : public QObject
 private Q_SLOTS:
     void initTestCase()
     {
-        qputenv("K2SYS_LOG_DIR", mLogs.path().toUtf8());
+        qputenv("K2SYS_LOG_DIR", m_logs.path().toUtf8());
         INIT_LOGGING(L"test");
     }
 
@@ -80,16 +80,16 @@ private Q_SLOTS:
 
     void init()
     {
-        mRoot = std::make_unique<QTemporaryDir>();
-        QVERIFY(mRoot->path().size() < 90);
-        qputenv("K2SYS_AC_DATA", mRoot->path().toUtf8());
+        m_root = std::make_unique<QTemporaryDir>();
+        QVERIFY(m_root->path().size() < 90);
+        qputenv("K2SYS_AC_DATA", m_root->path().toUtf8());
         qputenv("K2SYS_AC_ROOT", "");
-        QVERIFY(QDir(mRoot->path()).mkpath("defaultuser/user é"));
-        QVERIFY(QDir(mRoot->path()).mkpath("defaultuser/presets/templates_en"));
-        QVERIFY(QDir(mRoot->path()).mkpath("defaultuser/presets/templates_chs"));
+        QVERIFY(QDir(m_root->path()).mkpath("defaultuser/user é"));
+        QVERIFY(QDir(m_root->path()).mkpath("defaultuser/presets/templates_en"));
+        QVERIFY(QDir(m_root->path()).mkpath("defaultuser/presets/templates_chs"));
         write(base("PathInfo.xml"), "<p><Template path=\"presets\"/><TitlerTemplate path=\"user é\"/>"
                                     "<SystemSetting path=\"settings\"/><TitleResource path=\"titles\"/></p>");
-        mUser = base("user é");
+        m_user = base("user é");
     }
 
     void cleanup()
@@ -152,7 +152,7 @@ private Q_SLOTS:
     {
         makePreset("templates_en", "lower");
         setOrder(base("presets/templates_en"), {"lower.xml"});
-        const ReadOnlyTree tree(mRoot->path());
+        const ReadOnlyTree tree(m_root->path());
         const PrintedText printed;
         TemplateManager* const manager = TemplateManager::getInstance();
         QCOMPARE(namesOf(own(manager->getTemplates(TEMPLATE_LANGUAGE_EN))), QStringList{"lower"});
@@ -178,9 +178,9 @@ private Q_SLOTS:
 
     void aTemplateFolderThatIsAFile()
     {
-        QVERIFY(QDir(mUser).removeRecursively());
+        QVERIFY(QDir(m_user).removeRecursively());
         QVERIFY(QDir(base("presets")).removeRecursively());
-        write(mUser, "no folder");
+        write(m_user, "no folder");
         write(base("presets"), "no folder");
         const PrintedText printed;
         QVERIFY(TemplateManager::getInstance()->getTemplates(TEMPLATE_LANGUAGE_EN).empty());
@@ -189,7 +189,7 @@ private Q_SLOTS:
         QVERIFY(printed.text().find("S16 folderPath not a directory.") != std::string::npos);
         manager->reCreateNewOrderXml();
         QVERIFY(manager->getTemplates(TEMPLATE_LANGUAGE_EN).empty());
-        QCOMPARE(read(mUser), QByteArray("no folder"));
+        QCOMPARE(read(m_user), QByteArray("no folder"));
     }
 
     void userTemplatesAreOrderedByTime()
@@ -197,10 +197,10 @@ private Q_SLOTS:
         makeUserTemplate("young", 300);
         makeUserTemplate("old", 100);
         makeUserTemplate("middle", 200);
-        QVERIFY(QDir(mUser).mkpath("no title file"));
-        write(mUser + "/no title file/other.xml", "<a/>");
-        write(mUser + "/file", "x");
-        setOrder(mUser, {"gone/Titler.xml", "young/Titler.xml"});
+        QVERIFY(QDir(m_user).mkpath("no title file"));
+        write(m_user + "/no title file/other.xml", "<a/>");
+        write(m_user + "/file", "x");
+        setOrder(m_user, {"gone/Titler.xml", "young/Titler.xml"});
         UserTemplateManager* const manager = UserTemplateManager::getInstance();
         QCOMPARE(manager, UserTemplateManager::getInstance());
         QCOMPARE(rows(), QStringList({"old/Titler.xml", "middle/Titler.xml", "young/Titler.xml"}));
@@ -215,7 +215,7 @@ private Q_SLOTS:
     void titleFileNamedAfterItsFolder()
     {
         makeUserTemplate("a", 100);
-        QVERIFY(QDir(mUser).mkpath("named"));
+        QVERIFY(QDir(m_user).mkpath("named"));
         write(userFile("named/named.xml"), "<a/>");
         const PrintedText printed;
         QCOMPARE(UserTemplateManager::getInstance()->makeFolderList(), 1);
@@ -303,7 +303,7 @@ private Q_SLOTS:
         QFETCH(QStringList, files);
         QFETCH(QString, extension);
         UserTemplateManager* const manager = UserTemplateManager::getInstance();
-        QVERIFY(QDir(mUser).mkpath("新 template"));
+        QVERIFY(QDir(m_user).mkpath("新 template"));
         for (const QString& name : files)
             write(userFile("新 template/" + name), "picture");
         Archive archive;
@@ -356,7 +356,7 @@ private Q_SLOTS:
             QCOMPARE(manager->createNewTemplateXml(name, &archive), 0);
         QCOMPARE(manager->createNewTemplateXml("x", nullptr), 0);
         QVERIFY(archive.getPath().empty());
-        QCOMPARE(QDir(mUser).entryList(QDir::Files), QStringList{"file"});
+        QCOMPARE(QDir(m_user).entryList(QDir::Files), QStringList{"file"});
         QVERIFY(!QFile::exists(base("presets/Titler.xml")));
     }
 
@@ -465,7 +465,7 @@ private Q_SLOTS:
         makeUserTemplate("a", 100);
         makePreset("templates_en", "lower");
         UserTemplateManager* const manager = UserTemplateManager::getInstance();
-        setOrder(mUser, {"x", "a/Titler.xml", "", "../outside.xml"});
+        setOrder(m_user, {"x", "a/Titler.xml", "", "../outside.xml"});
         auto templates = own(manager->getTemplates(TEMPLATE_LANGUAGE_EN));
         QCOMPARE(namesOf(templates), QStringList({"a/Titler", ""}));
         setOrder(base("presets/templates_en"), {"xml", "lower.xml"});
@@ -479,7 +479,7 @@ private Q_SLOTS:
     {
         makeUserTemplate("plain", 100);
         makeUserTemplate("line\nbreak & 'quotes'", 200);
-        const std::string bad = mUser.toStdString() + "/bad\xff\xfe";
+        const std::string bad = m_user.toStdString() + "/bad\xff\xfe";
         QCOMPARE(::mkdir(bad.c_str(), 0755), 0);
         QCOMPARE(::link(userFile("plain/Titler.xml").toUtf8().constData(), (bad + "/Titler.xml").c_str()), 0);
         UserTemplateManager* const manager = UserTemplateManager::getInstance();
@@ -496,8 +496,8 @@ private Q_SLOTS:
         UserTemplateManager::getInstance();
         UserTemplateManager::cleanUp();
         const QByteArray order = read(userFile(".order.xml"));
-        QVERIFY(QDir(mUser).mkpath("imported"));
-        const ReadOnlyTree tree(mRoot->path());
+        QVERIFY(QDir(m_user).mkpath("imported"));
+        const ReadOnlyTree tree(m_root->path());
         UserTemplateManager* const manager = UserTemplateManager::getInstance();
         QCOMPARE(namesOf(own(manager->getTemplates(TEMPLATE_LANGUAGE_EN))),
                  QStringList({"a/Titler", "b/Titler"}));
@@ -518,23 +518,23 @@ private Q_SLOTS:
         const QByteArray title = titleBytes();
         for (int i = 1; i <= 998; ++i) {
             const QString name = QStringLiteral("UserTemplate_%1").arg(i, 3, 10, QChar('0'));
-            QVERIFY(QDir(mUser).mkdir(name));
+            QVERIFY(QDir(m_user).mkdir(name));
             write(userFile(name + "/Titler.xml"), title);
         }
         UserTemplateManager* const manager = UserTemplateManager::getInstance();
         QCOMPARE(rows().size(), 998);
         QCOMPARE(own(manager->getTemplates(TEMPLATE_LANGUAGE_EN)).size(), std::size_t(998));
         ArchiveController controller;
-        QCOMPARE(controller.getFreeNameInUserTemplate(mUser), QString("UserTemplate_999"));
+        QCOMPARE(controller.getFreeNameInUserTemplate(m_user), QString("UserTemplate_999"));
         manager->addNewTemplateToLastInOrderXml("UserTemplate_999");
         QCOMPARE(rows().size(), 999);
-        QVERIFY(controller.getFreeNameInUserTemplate(mUser).isEmpty());
+        QVERIFY(controller.getFreeNameInUserTemplate(m_user).isEmpty());
         // 999 stays; with two gaps there is room again, below.
         for (const char* name : {"UserTemplate_500", "UserTemplate_700"})
             QCOMPARE(manager->deleteTemplatePath(userFile(name).toStdString() + "/Titler.xml"), 1);
         manager->addNewTemplateToLastInOrderXml("UserTemplate_999");
         QCOMPARE(rows().size(), 997);
-        QCOMPARE(controller.getFreeNameInUserTemplate(mUser), QString("UserTemplate_500"));
+        QCOMPARE(controller.getFreeNameInUserTemplate(m_user), QString("UserTemplate_500"));
     }
 
 private:
@@ -542,22 +542,22 @@ private:
     class ReadOnlyTree
     {
     public:
-        explicit ReadOnlyTree(const QString& folder) : mFolder(folder)
+        explicit ReadOnlyTree(const QString& folder) : m_folder(folder)
         {
             change(QFile::ReadOwner | QFile::ExeOwner | QFile::ReadGroup | QFile::ExeGroup |
                    QFile::ReadOther | QFile::ExeOther);
-            mUser = std::make_unique<OrdinaryUser>();
+            m_user = std::make_unique<OrdinaryUser>();
         }
         ~ReadOnlyTree()
         {
-            mUser.reset();
+            m_user.reset();
             change(QFile::ReadOwner | QFile::WriteOwner | QFile::ExeOwner);
         }
 
     private:
         void change(QFile::Permissions permissions)
         {
-            QStringList folders{mFolder};
+            QStringList folders{m_folder};
             while (!folders.isEmpty()) {
                 const QString folder = folders.takeLast();
                 QFile::setPermissions(folder, permissions);
@@ -566,12 +566,12 @@ private:
             }
         }
 
-        QString mFolder;
-        std::unique_ptr<OrdinaryUser> mUser;
+        QString m_folder;
+        std::unique_ptr<OrdinaryUser> m_user;
     };
 
-    QString base(const QString& name) const { return mRoot->path() + "/defaultuser/" + name; }
-    QString userFile(const QString& name) const { return mUser + '/' + name; }
+    QString base(const QString& name) const { return m_root->path() + "/defaultuser/" + name; }
+    QString userFile(const QString& name) const { return m_user + '/' + name; }
 
     static void fill(Archive& archive)
     {
@@ -606,7 +606,7 @@ private:
     // Its title file was last changed so many seconds after 1970.
     void makeUserTemplate(const QString& name, int seconds) const
     {
-        QVERIFY(QDir(mUser).mkpath(name));
+        QVERIFY(QDir(m_user).mkpath(name));
         for (const char* picture : {"Titler_240.png", "Titler_source_1280.png", "Titler_source_1920.png"})
             write(userFile(name + '/' + picture), "picture");
         const QString path = userFile(name + "/Titler.xml");
@@ -632,7 +632,7 @@ private:
     QStringList rows() const
     {
         QStringList paths;
-        for (ArchiveOrder* row : ArchiveManager().getArchivesSortUnderFolder(mUser.toStdString())) {
+        for (ArchiveOrder* row : ArchiveManager().getArchivesSortUnderFolder(m_user.toStdString())) {
             paths.append(QString::fromStdString(row->getArchivePath()));
             delete row;
         }
@@ -652,9 +652,9 @@ private:
             qFatal("cannot write %s", qPrintable(name));
     }
 
-    QTemporaryDir mLogs;
-    std::unique_ptr<QTemporaryDir> mRoot;
-    QString mUser;
+    QTemporaryDir m_logs;
+    std::unique_ptr<QTemporaryDir> m_root;
+    QString m_user;
 };
 
 QTEST_GUILESS_MAIN(tst_templatemanager)

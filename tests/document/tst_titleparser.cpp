@@ -104,7 +104,7 @@ class tst_titleparser : public QObject
     Q_OBJECT
 
 private Q_SLOTS:
-    void init() { mFolder = std::make_unique<QTemporaryDir>(); }
+    void init() { m_folder = std::make_unique<QTemporaryDir>(); }
 
     void cleanup() { QVERIFY(FileSyncQueue::flush(std::chrono::seconds(30))); }
 
@@ -112,9 +112,9 @@ private Q_SLOTS:
     {
         const std::string file = path("标题 한국 é.xml");
         const auto written = richTitle(file);
-        QCOMPARE(mParser.writeOneTitle(written.get()), 1);
+        QCOMPARE(m_parser.writeOneTitle(written.get()), 1);
         Archive read;
-        QCOMPARE(mParser.readOneTitle(file, &read), 1);
+        QCOMPARE(m_parser.readOneTitle(file, &read), 1);
         QCOMPARE(read.getPath(), file);
         QVERIFY(read.getName().empty());
         QCOMPARE(read.getOrder(), std::string(1, '\xff'));
@@ -150,7 +150,7 @@ private Q_SLOTS:
         style->setText("é");
         text->setTextItems({style});
         archive.setText({text});
-        QCOMPARE(mParser.writeOneTitle(&archive), 1);
+        QCOMPARE(m_parser.writeOneTitle(&archive), 1);
         QCOMPARE(
             read("t.xml"),
             QByteArray("<?xml version=\"1.0\" encoding=\"utf-8\" ?>\n"
@@ -176,7 +176,7 @@ private Q_SLOTS:
     {
         const auto archive = richTitle(path("t.xml"));
         archive->getText()[2]->setText("no reference");
-        mParser.writeOneTitle(archive.get());
+        m_parser.writeOneTitle(archive.get());
         TiXmlDocument document;
         QVERIFY(document.LoadFile(path("t.xml").c_str(), TIXML_ENCODING_UNKNOWN));
         QVERIFY(document.SaveFile(path("u.xml").c_str()));
@@ -186,17 +186,17 @@ private Q_SLOTS:
     void refusals()
     {
         Archive archive;
-        QCOMPARE(mParser.writeOneTitle(&archive), 0);
-        QCOMPARE(mParser.writeOneTitle(nullptr), 0);
-        QVERIFY(QDir(mFolder->path()).isEmpty());
-        QCOMPARE(mParser.readOneTitle(path("missing.xml"), &archive), 0);
+        QCOMPARE(m_parser.writeOneTitle(&archive), 0);
+        QCOMPARE(m_parser.writeOneTitle(nullptr), 0);
+        QVERIFY(QDir(m_folder->path()).isEmpty());
+        QCOMPARE(m_parser.readOneTitle(path("missing.xml"), &archive), 0);
         QVERIFY(archive.getPath().empty());
-        QCOMPARE(mParser.readOneTitle(path("missing.xml"), nullptr), 0);
+        QCOMPARE(m_parser.readOneTitle(path("missing.xml"), nullptr), 0);
         archive.setPath(path("no/folder.xml"));
-        QCOMPARE(mParser.writeOneTitle(&archive), -1);
+        QCOMPARE(m_parser.writeOneTitle(&archive), -1);
         QCOMPARE(errno, ENOENT);
         archive.setPath("/dev/full");
-        QCOMPARE(mParser.writeOneTitle(&archive), -1);
+        QCOMPARE(m_parser.writeOneTitle(&archive), -1);
         QCOMPARE(errno, ENOSPC);
     }
 
@@ -204,7 +204,7 @@ private Q_SLOTS:
     {
         write("t.xml", "<anything type=\"no\" version=\"7\"><meta-bg/><meta-text/></anything>");
         Archive archive;
-        QCOMPARE(mParser.readOneTitle(path("t.xml"), &archive), 1);
+        QCOMPARE(m_parser.readOneTitle(path("t.xml"), &archive), 1);
         QCOMPARE(archive.getVersion(), std::string("7"));
         QVERIFY(archive.getText().empty());
     }
@@ -214,7 +214,7 @@ private Q_SLOTS:
         write("t.xml", title("<meta-text>" + content("text=\"x\"") + "</meta-text>"));
         Archive archive;
         archive.setClip("9");
-        QCOMPARE(mParser.readOneTitle(path("t.xml"), &archive), 1);
+        QCOMPARE(m_parser.readOneTitle(path("t.xml"), &archive), 1);
         QVERIFY(archive.getClip().empty() && archive.getGain().empty() && archive.getDensity().empty());
         QCOMPARE(archive.getBgPointZ(), 0.0f);
         const TText& text = *archive.getText()[0];
@@ -242,7 +242,7 @@ private Q_SLOTS:
                                           "text-kerning=\"word\" text=\"y\" font=\"F\"/>") +
                     "</meta-text>"));
         Archive archive;
-        QCOMPARE(mParser.readOneTitle(path("t.xml"), &archive), 1);
+        QCOMPARE(m_parser.readOneTitle(path("t.xml"), &archive), 1);
         const TextStyle& style = *archive.getText()[0]->getTextItems()[0];
         QCOMPARE(style.getText(), std::string("y"));
         QCOMPARE(style.getFontFamily(), std::string("F"));
@@ -257,14 +257,14 @@ private Q_SLOTS:
     {
         Archive archive;
         write("a.xml", "<m version=\"5\" thumbnail-big=\"b\"><meta-text/></m>");
-        QCOMPARE(mParser.readOneTitle(path("a.xml"), &archive), 0);
+        QCOMPARE(m_parser.readOneTitle(path("a.xml"), &archive), 0);
         QCOMPARE(archive.getVersion(), std::string("5"));
         QCOMPARE(archive.getThumbnailBig(), std::string("b"));
         write("b.xml", "<m><meta-bg resource=\"r\"/></m>");
-        QCOMPARE(mParser.readOneTitle(path("b.xml"), &archive), 0);
+        QCOMPARE(m_parser.readOneTitle(path("b.xml"), &archive), 0);
         QCOMPARE(archive.getBgResource(), std::string("r"));
         write("c.xml", "<?xml version=\"1.0\" ?>");
-        QCOMPARE(mParser.readOneTitle(path("c.xml"), &archive), 0);
+        QCOMPARE(m_parser.readOneTitle(path("c.xml"), &archive), 0);
         QCOMPARE(archive.getPath(), path("c.xml"));
     }
 
@@ -274,7 +274,7 @@ private Q_SLOTS:
                              content("text=\"\"") + content("id=\"2\"") + content("text=\"no items\"", "") +
                              content("text=\"two\"", ONE_ITEM + "<other/>" + ONE_ITEM) + "</meta-text>"));
         Archive archive;
-        QCOMPARE(mParser.readOneTitle(path("t.xml"), &archive), 1);
+        QCOMPARE(m_parser.readOneTitle(path("t.xml"), &archive), 1);
         QCOMPARE(archive.getText().size(), std::size_t(2));
         QCOMPARE(archive.getText()[0]->getText(), std::string("one"));
         QCOMPARE(archive.getText()[1]->getText(), std::string("two"));
@@ -288,17 +288,17 @@ private Q_SLOTS:
         auto* text = new TText;
         text->setTextItems({new TextStyle});
         archive.setText({text});
-        mParser.writeOneTitle(&archive);
+        m_parser.writeOneTitle(&archive);
         QVERIFY(read("t.xml").contains("shadow-blur-radius=\"18\""));
         for (const auto& [value, expected] : {std::pair(1e300, "2147483647"), std::pair(-7.9, "-7")}) {
             text->getTextShadow()->setShadowBlurRadius(value);
-            mParser.writeOneTitle(&archive);
+            m_parser.writeOneTitle(&archive);
             QVERIFY(read("t.xml").contains("shadow-blur-radius=\"" + QByteArray(expected) + "\""));
         }
         write("t.xml",
               title("<meta-text>" + content("text=\"x\" shadow-blur-radius=\"18.3\"") + "</meta-text>"));
         Archive loaded;
-        QCOMPARE(mParser.readOneTitle(path("t.xml"), &loaded), 1);
+        QCOMPARE(m_parser.readOneTitle(path("t.xml"), &loaded), 1);
         QCOMPARE(loaded.getText()[0]->getTextShadow()->getShadowBlurRadius(), 18.3);
     }
 
@@ -313,14 +313,14 @@ private Q_SLOTS:
         style->setText("\x08");
         text->setTextItems({style});
         archive.setText({text});
-        QCOMPARE(mParser.writeOneTitle(&archive), 1);
+        QCOMPARE(m_parser.writeOneTitle(&archive), 1);
 
         QXmlStreamReader strict(read("t.xml"));
         while (!strict.atEnd())
             strict.readNext();
         QVERIFY2(!strict.hasError(), qPrintable(strict.errorString()));
         Archive loaded;
-        QCOMPARE(mParser.readOneTitle(path("t.xml"), &loaded), 1);
+        QCOMPARE(m_parser.readOneTitle(path("t.xml"), &loaded), 1);
         QCOMPARE(loaded.getText()[0]->getText(), std::string("a\uFFFD\uFFFD\uFFFD\uFFFD\uFFFD\t\nz"));
         QCOMPARE(loaded.getText()[0]->getTextItems()[0]->getText(), std::string("\uFFFD"));
     }
@@ -336,9 +336,9 @@ private Q_SLOTS:
             text->setText(bytes);
             text->setTextItems({new TextStyle});
             archive.setText({text});
-            QCOMPARE(mParser.writeOneTitle(&archive), 1);
+            QCOMPARE(m_parser.writeOneTitle(&archive), 1);
             Archive loaded;
-            QCOMPARE(mParser.readOneTitle(path("u.xml"), &loaded), 1);
+            QCOMPARE(m_parser.readOneTitle(path("u.xml"), &loaded), 1);
             const QString read = QString::fromStdString(loaded.text().front()->getText());
             QVERIFY2(read.contains(QChar::ReplacementCharacter), bytes);
             QCOMPARE(read, QString::fromUtf8(bytes));
@@ -353,10 +353,10 @@ private Q_SLOTS:
         text->setText("");
         text->setTextItems({new TextStyle});
         archive.setText({text, nullptr});
-        QCOMPARE(mParser.writeOneTitle(&archive), 1);
+        QCOMPARE(m_parser.writeOneTitle(&archive), 1);
         QVERIFY(read("t.xml").contains("content-count=\"2\"") && read("t.xml").contains("<content />"));
         Archive loaded;
-        QCOMPARE(mParser.readOneTitle(path("t.xml"), &loaded), 1);
+        QCOMPARE(m_parser.readOneTitle(path("t.xml"), &loaded), 1);
         QVERIFY(loaded.getText().empty());
         archive.setText({text});
     }
@@ -368,9 +368,9 @@ private Q_SLOTS:
         for (const char* name : {"de_DE.UTF-8", "fr_FR.UTF-8"})
             std::setlocale(LC_ALL, name);
         const auto archive = richTitle(path("t.xml"));
-        mParser.writeOneTitle(archive.get());
+        m_parser.writeOneTitle(archive.get());
         Archive loaded;
-        mParser.readOneTitle(path("t.xml"), &loaded);
+        m_parser.readOneTitle(path("t.xml"), &loaded);
         std::setlocale(LC_ALL, before.c_str());
         QVERIFY(read("t.xml").contains("position-X=\"-12.5\""));
         QCOMPARE(loaded.getBgPointX(), -12.5f);
@@ -386,20 +386,20 @@ private Q_SLOTS:
     void propertiesChangeInPlace()
     {
         const auto archive = richTitle(path("t.xml"));
-        mParser.writeOneTitle(archive.get());
+        m_parser.writeOneTitle(archive.get());
         QByteArray expected = read("t.xml");
         expected.replace(" clip=\"1\"", " clip=\"é&lt;\"").replace(" gain=\"2\"", " gain=\"20\"");
         expected.replace(" density=\"3\"", " density=\"\"");
-        QCOMPARE(mParser.modifyProp(KeyDefine::TITLE_PROP_CLIP, path("t.xml"), "é<"), 1);
-        QCOMPARE(mParser.modifyGain(path("t.xml"), "20"), 1);
-        QCOMPARE(mParser.modifyProp(KeyDefine::TITLE_PROP_ID_t(2), path("t.xml"), ""), 1);
+        QCOMPARE(m_parser.modifyProp(KeyDefine::TITLE_PROP_CLIP, path("t.xml"), "é<"), 1);
+        QCOMPARE(m_parser.modifyGain(path("t.xml"), "20"), 1);
+        QCOMPARE(m_parser.modifyProp(KeyDefine::TITLE_PROP_ID_t(2), path("t.xml"), ""), 1);
         QCOMPARE(read("t.xml"), expected);
-        QCOMPARE(mParser.modifyProp(KeyDefine::TITLE_PROP_ID_t(3), path("t.xml"), "7"), 0);
+        QCOMPARE(m_parser.modifyProp(KeyDefine::TITLE_PROP_ID_t(3), path("t.xml"), "7"), 0);
         QCOMPARE(read("t.xml"), expected);
-        QCOMPARE(mParser.modifyAttributeValue(path("t.xml"), "new", "v"), 1);
+        QCOMPARE(m_parser.modifyAttributeValue(path("t.xml"), "new", "v"), 1);
         QVERIFY(read("t.xml").contains(" new=\"v\">"));
-        QCOMPARE(mParser.modifyDensity(path("missing.xml"), "7"), 0);
-        QVERIFY(!QFile::exists(mFolder->filePath("missing.xml")));
+        QCOMPARE(m_parser.modifyDensity(path("missing.xml"), "7"), 0);
+        QVERIFY(!QFile::exists(m_folder->filePath("missing.xml")));
     }
 
     void findsNodesByName()
@@ -407,15 +407,15 @@ private Q_SLOTS:
         TiXmlDocument document;
         document.Parse("<a><b n=\"1\"><c n=\"2\"/></b><c n=\"3\"/></a>");
         TiXmlElement* found = nullptr;
-        QVERIFY(mParser.getNodePointerByName(document.RootElement(), "c", found));
-        QCOMPARE(mParser.getIntAttribute(found, "n"), 2);
-        QVERIFY(mParser.getNodePointerByName(document.RootElement(), "a", found));
+        QVERIFY(m_parser.getNodePointerByName(document.RootElement(), "c", found));
+        QCOMPARE(m_parser.getIntAttribute(found, "n"), 2);
+        QVERIFY(m_parser.getNodePointerByName(document.RootElement(), "a", found));
         QCOMPARE(found, document.RootElement());
         // Siblings of the start are not searched.
-        QVERIFY(!mParser.getNodePointerByName(document.RootElement()->FirstChildElement("b"), "a", found));
-        QVERIFY(!mParser.getNodePointerByName(nullptr, "a", found));
-        QCOMPARE(mParser.getAttribute(nullptr, "n"), std::string());
-        QCOMPARE(mParser.getDoubleAttribute(found, "n"), 0.0);
+        QVERIFY(!m_parser.getNodePointerByName(document.RootElement()->FirstChildElement("b"), "a", found));
+        QVERIFY(!m_parser.getNodePointerByName(nullptr, "a", found));
+        QCOMPARE(m_parser.getAttribute(nullptr, "n"), std::string());
+        QCOMPARE(m_parser.getDoubleAttribute(found, "n"), 0.0);
     }
 
     void hostileTitles_data()
@@ -440,10 +440,10 @@ private Q_SLOTS:
         Archive archive;
         QElapsedTimer timer;
         timer.start();
-        QCOMPARE(mParser.readOneTitle(path("t.xml"), &archive), 0);
-        QCOMPARE(mParser.modifyClip(path("t.xml"), "1"), 0);
-        QVERIFY(mParser.readFileOrderInFolder(folder()).empty());
-        QVERIFY(mParser.getFilsByOrderInFolder(folder()).empty());
+        QCOMPARE(m_parser.readOneTitle(path("t.xml"), &archive), 0);
+        QCOMPARE(m_parser.modifyClip(path("t.xml"), "1"), 0);
+        QVERIFY(m_parser.readFileOrderInFolder(folder()).empty());
+        QVERIFY(m_parser.getFilsByOrderInFolder(folder()).empty());
         QVERIFY(timer.elapsed() < PATIENCE_MS);
         QCOMPARE(read("t.xml"), bytes);
     }
@@ -451,24 +451,24 @@ private Q_SLOTS:
     void everyTruncation()
     {
         const auto archive = richTitle(path("whole.xml"));
-        mParser.writeOneTitle(archive.get());
+        m_parser.writeOneTitle(archive.get());
         const QByteArray bytes = read("whole.xml");
         int readable = 0;
         for (qsizetype size = 0; size < bytes.size(); ++size) {
             write("t.xml", bytes.left(size));
             Archive loaded;
-            readable += mParser.readOneTitle(path("t.xml"), &loaded);
+            readable += m_parser.readOneTitle(path("t.xml"), &loaded);
         }
         QCOMPARE(readable, 1); // without its last line feed
     }
 
     void orderTruncations()
     {
-        mParser.writeFileOrderInFolder(folder(), {row(0, "标题.xml"), row(1, "b.xml")});
+        m_parser.writeFileOrderInFolder(folder(), {row(0, "标题.xml"), row(1, "b.xml")});
         const QByteArray bytes = read(".order.xml");
         for (qsizetype size = 0; size < bytes.size(); ++size) {
             write(".order.xml", bytes.left(size));
-            const auto rows = mParser.readFileOrderInFolder(folder());
+            const auto rows = m_parser.readFileOrderInFolder(folder());
             QCOMPARE(rows.size(), size == bytes.size() - 1 ? std::size_t(2) : std::size_t(0));
             qDeleteAll(rows);
         }
@@ -476,8 +476,8 @@ private Q_SLOTS:
 
     void orderFile()
     {
-        QVERIFY(mParser.readFileOrderInFolder(folder()).empty());
-        QCOMPARE(mParser.writeFileOrderInFolder(folder(), {row(5, "a.xml"), row(3, "é 中.xml"), row(1, "")}),
+        QVERIFY(m_parser.readFileOrderInFolder(folder()).empty());
+        QCOMPARE(m_parser.writeFileOrderInFolder(folder(), {row(5, "a.xml"), row(3, "é 中.xml"), row(1, "")}),
                  1);
         QCOMPARE(read(".order.xml"), QByteArray("<?xml version=\"1.0\" encoding=\"utf-8\" ?>\n"
                                                 "<manifest type=\"order\" index-count=\"3\">\n"
@@ -485,14 +485,14 @@ private Q_SLOTS:
                                                 "    <index value=\"3\" file-path=\"é 中.xml\" />\n"
                                                 "    <index value=\"1\" file-path=\"\" />\n"
                                                 "</manifest>\n"));
-        auto rows = mParser.readFileOrderInFolder(folder());
+        auto rows = m_parser.readFileOrderInFolder(folder());
         QCOMPARE(rows.size(), std::size_t(3));
         QCOMPARE(rows[0]->getArchiveIndex(), 5);
         QCOMPARE(rows[1]->getArchivePath(), std::string("é 中.xml"));
         QVERIFY(rows[2]->getArchivePath().empty());
         qDeleteAll(rows);
-        QCOMPARE(mParser.writeFileOrderInFolder(folder() + "/missing", {}), -1);
-        QCOMPARE(mParser.writeFileOrderInFolder(folder(), {}), 1);
+        QCOMPARE(m_parser.writeFileOrderInFolder(folder() + "/missing", {}), -1);
+        QCOMPARE(m_parser.writeFileOrderInFolder(folder(), {}), 1);
         QVERIFY(read(".order.xml").contains("index-count=\"0\""));
     }
 
@@ -500,7 +500,7 @@ private Q_SLOTS:
     {
         for (const char* name : {"a.xml", "b.xml", "c.xml", "unnamed.xml"}) {
             const auto archive = richTitle(path(name));
-            mParser.writeOneTitle(archive.get());
+            m_parser.writeOneTitle(archive.get());
         }
         write("broken.xml", "<m>");
         write(".order.xml",
@@ -509,8 +509,8 @@ private Q_SLOTS:
               "file-path=\"broken.xml\"/><index value=\"1\"/><index value=\"1\" file-path=\"a.xml\"/>"
               "</any>");
         for (int variant = 0; variant < 2; ++variant) {
-            const auto titles = variant == 0 ? mParser.getFilsByOrderInFolder(folder())
-                                             : mParser.getFilesByOrderInFolderWithoutCheck(folder());
+            const auto titles = variant == 0 ? m_parser.getFilsByOrderInFolder(folder())
+                                             : m_parser.getFilesByOrderInFolderWithoutCheck(folder());
             QCOMPARE(titles.size(), std::size_t(3));
             QCOMPARE(titles[0]->getName(), std::string("c"));
             QCOMPARE(titles[0]->getOrder(), std::string("1"));
@@ -541,12 +541,12 @@ private Q_SLOTS:
                 continue;
             }
             const auto archive = richTitle(path((name + ".xml").c_str()));
-            mParser.writeOneTitle(archive.get());
+            m_parser.writeOneTitle(archive.get());
             wanted.push_back(name + " at " + std::to_string(ROWS - i + 1));
         }
-        mParser.writeFileOrderInFolder(folder(), rows);
+        m_parser.writeFileOrderInFolder(folder(), rows);
         std::vector<std::string> found;
-        const auto titles = mParser.getFilsByOrderInFolder(folder());
+        const auto titles = m_parser.getFilsByOrderInFolder(folder());
         for (const Archive* title : titles) {
             QCOMPARE(title->getText().size(), std::size_t(3));
             found.push_back(title->getName() + " at " + title->getOrder());
@@ -563,9 +563,9 @@ private Q_SLOTS:
             const std::string name = "title" + std::to_string(i) + ".xml";
             rows.push_back(row(i, name.c_str()));
             const auto archive = richTitle(path(name.c_str()));
-            mParser.writeOneTitle(archive.get());
+            m_parser.writeOneTitle(archive.get());
         }
-        mParser.writeFileOrderInFolder(folder(), rows);
+        m_parser.writeFileOrderInFolder(folder(), rows);
         const FolderTitles titles(folder());
         QCOMPARE(titles.count(), rows.size());
         QVERIFY(titles.read(0) && titles.read(0)->getPath().empty());
@@ -587,16 +587,16 @@ private Q_SLOTS:
 
     void templateRowsPointIntoFolders()
     {
-        QVERIFY(QDir(mFolder->path()).mkdir("UserTemplate_001"));
+        QVERIFY(QDir(m_folder->path()).mkdir("UserTemplate_001"));
         const auto archive = richTitle(path("UserTemplate_001/Titler.xml"));
-        mParser.writeOneTitle(archive.get());
-        mParser.writeFileOrderInFolder(folder(), {row(0, "UserTemplate_001/Titler.xml")});
-        const auto titles = mParser.getFilsByOrderInFolder(folder());
+        m_parser.writeOneTitle(archive.get());
+        m_parser.writeFileOrderInFolder(folder(), {row(0, "UserTemplate_001/Titler.xml")});
+        const auto titles = m_parser.getFilsByOrderInFolder(folder());
         QCOMPARE(titles.size(), std::size_t(1));
         QCOMPARE(titles[0]->getName(), std::string("UserTemplate_001/Titler"));
         qDeleteAll(titles);
-        mParser.writeFileOrderInFolder(folder(), {row(0, "a.x")});
-        QVERIFY_EXCEPTION_THROWN(mParser.getFilsByOrderInFolder(folder()), std::out_of_range);
+        m_parser.writeFileOrderInFolder(folder(), {row(0, "a.x")});
+        QVERIFY_EXCEPTION_THROWN(m_parser.getFilsByOrderInFolder(folder()), std::out_of_range);
     }
 
     void listings()
@@ -606,7 +606,7 @@ private Q_SLOTS:
         for (const char* name : {"a.xml", "b.xml.bak", "C.XML", "d.png", ".order.xml", "中.xml"})
             write(name, "x");
         for (const char* name : {"dir.xml", ".hidden", "with.dot", "新闻"})
-            QVERIFY(QDir(mFolder->path()).mkdir(name));
+            QVERIFY(QDir(m_folder->path()).mkdir(name));
         auto files = TitleParserUtility::queryFilesInFolder(folder());
         std::sort(files.begin(), files.end());
         QCOMPARE(files, std::vector<std::string>(
@@ -634,24 +634,24 @@ private:
         return order;
     }
 
-    std::string folder() const { return mFolder->path().toStdString(); }
-    std::string path(const QString& name) const { return mFolder->filePath(name).toStdString(); }
+    std::string folder() const { return m_folder->path().toStdString(); }
+    std::string path(const QString& name) const { return m_folder->filePath(name).toStdString(); }
 
     QByteArray read(const QString& name) const
     {
-        QFile file(mFolder->filePath(name));
+        QFile file(m_folder->filePath(name));
         return file.open(QIODevice::ReadOnly) ? file.readAll() : QByteArray();
     }
 
     void write(const QString& name, const QByteArray& bytes) const
     {
-        QFile file(mFolder->filePath(name));
+        QFile file(m_folder->filePath(name));
         if (!file.open(QIODevice::WriteOnly) || file.write(bytes) != bytes.size())
             qFatal("cannot write %s", qPrintable(name));
     }
 
-    std::unique_ptr<QTemporaryDir> mFolder;
-    TitleParser mParser;
+    std::unique_ptr<QTemporaryDir> m_folder;
+    TitleParser m_parser;
 };
 
 QTEST_GUILESS_MAIN(tst_titleparser)

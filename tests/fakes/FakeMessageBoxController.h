@@ -15,12 +15,12 @@ class FakeMessageBoxController : public MessageBoxController
 public:
     FakeMessageBoxController()
     {
-        sCurrent = this;
-        setProvider([]() -> MessageBoxController* { return sCurrent; }, [] {});
+        s_current = this;
+        setProvider([]() -> MessageBoxController* { return s_current; }, [] {});
     }
     ~FakeMessageBoxController() override
     {
-        sCurrent = nullptr;
+        s_current = nullptr;
         setProvider(nullptr, nullptr);
     }
 
@@ -50,5 +50,5 @@ public:
     QList<QPair<int, QString>> posted;
 
 private:
-    inline static FakeMessageBoxController* sCurrent = nullptr;
+    inline static FakeMessageBoxController* s_current = nullptr;
 };

@@ -21,7 +21,7 @@ public:
     enum class Pictures { Pass, Hold };
 
     // With Hold each report that pictures were written waits until goOn is released.
-    explicit FakeTitleChangeReporter(Pictures pictures = Pictures::Pass) : mPictures(pictures)
+    explicit FakeTitleChangeReporter(Pictures pictures = Pictures::Pass) : m_pictures(pictures)
     {
         setInstance(this);
     }
@@ -30,11 +30,11 @@ public:
     void changeTitlerStatus(FileManagerDefine::emTITLECHANGE_TYPE type, QString path) override
     {
         {
-            QMutexLocker lock(&mMutex);
-            mReports.append({static_cast<int>(type), path});
+            QMutexLocker lock(&m_mutex);
+            m_reports.append({static_cast<int>(type), path});
         }
         // Other reports come from the GUI thread, which must not be blocked.
-        if (mPictures == Pictures::Hold && type == FileManagerDefine::TITLE_PICTURES_CHANGED) {
+        if (m_pictures == Pictures::Hold && type == FileManagerDefine::TITLE_PICTURES_CHANGED) {
             reached.release();
             goOn.acquire();
         }
@@ -43,8 +43,8 @@ public:
     // Returns the reports since the last call, with full paths.
     Reports takePaths()
     {
-        QMutexLocker lock(&mMutex);
-        return std::exchange(mReports, {});
+        QMutexLocker lock(&m_mutex);
+        return std::exchange(m_reports, {});
     }
     // The same with the names of the files, without folder and ending.
     Reports take()
@@ -59,7 +59,7 @@ public:
     QSemaphore goOn;    // released by the test, once per job
 
 private:
-    const Pictures mPictures;
-    QMutex mMutex;
-    Reports mReports;
+    const Pictures m_pictures;
+    QMutex m_mutex;
+    Reports m_reports;
 };

@@ -38,13 +38,13 @@ class FakeTitlerCallBack : public ITitlerCallBack
 public:
     using Taker = std::function<void(const _CALLBACK_TITLER_PARAMTER&)>;
 
-    explicit FakeTitlerCallBack(Taker taker) : mTaker(std::move(taker)) {}
+    explicit FakeTitlerCallBack(Taker taker) : m_taker(std::move(taker)) {}
     explicit FakeTitlerCallBack(Answers& answers)
-        : mTaker([&answers](const _CALLBACK_TITLER_PARAMTER& param) { answers.add(param); })
+        : m_taker([&answers](const _CALLBACK_TITLER_PARAMTER& param) { answers.add(param); })
     {
     }
-    void finishTitlerCreateCallback(_CALLBACK_TITLER_PARAMTER param) override { mTaker(param); }
+    void finishTitlerCreateCallback(_CALLBACK_TITLER_PARAMTER param) override { m_taker(param); }
 
 private:
-    Taker mTaker;
+    Taker m_taker;
 };

@@ -15,13 +15,13 @@ public:
     FakeTitlerFolderReporter() { setInstance(this); }
     ~FakeTitlerFolderReporter() override { setInstance(nullptr); }
 
-    void editFolderStartStatus(QString folder) override { mReports.append({"start", folder, {}}); }
-    void editFolderEndStatus(QString folder) override { mReports.append({"end", folder, {}}); }
-    void updateTitlerOrder(QString folder) override { mReports.append({"order", folder, {}}); }
-    void renameFolderStartStatus(QString folder) override { mReports.append({"rename", folder, {}}); }
+    void editFolderStartStatus(QString folder) override { m_reports.append({"start", folder, {}}); }
+    void editFolderEndStatus(QString folder) override { m_reports.append({"end", folder, {}}); }
+    void updateTitlerOrder(QString folder) override { m_reports.append({"order", folder, {}}); }
+    void renameFolderStartStatus(QString folder) override { m_reports.append({"rename", folder, {}}); }
     void changeTitlerFolderName(QString oldPath, QString newPath) override
     {
-        mReports.append({"renamed", oldPath, newPath});
+        m_reports.append({"renamed", oldPath, newPath});
     }
 
     // Returns the reports since the last call with the names of the folders: "start news", "renamed news to
@@ -47,7 +47,7 @@ private:
     QStringList takeLines(Shown shown)
     {
         QStringList lines;
-        for (const Report& report : std::exchange(mReports, {})) {
+        for (const Report& report : std::exchange(m_reports, {})) {
             QString line = report.what + QLatin1Char(' ') + shown(report.folder);
             if (!report.newPath.isNull())
                 line += QStringLiteral(" to ") + shown(report.newPath);
@@ -56,5 +56,5 @@ private:
         return lines;
     }
 
-    QList<Report> mReports;
+    QList<Report> m_reports;
 };

@@ -17,31 +17,31 @@ public:
 
     int start(QObject* receiver, int milliseconds) override
     {
-        mTimers.insert(++mLastId, {receiver, mNow + milliseconds, milliseconds});
-        return mLastId;
+        m_timers.insert(++m_lastId, {receiver, m_now + milliseconds, milliseconds});
+        return m_lastId;
     }
-    void stop(QObject*, int id) override { mTimers.remove(id); }
+    void stop(QObject*, int id) override { m_timers.remove(id); }
 
     // Advances the clock and fires the timers that become due, in order.
     void advance(int milliseconds)
     {
-        const qint64 end = mNow + milliseconds;
+        const qint64 end = m_now + milliseconds;
         for (int id = nextUntil(end); id != 0; id = nextUntil(end)) {
-            Timer& timer = mTimers[id];
-            mNow = timer.due;
+            Timer& timer = m_timers[id];
+            m_now = timer.due;
             timer.due += qMax(timer.interval, 1);
             const QPointer<QObject> receiver = timer.receiver;
             if (!receiver) {
-                mTimers.remove(id);
+                m_timers.remove(id);
                 continue;
             }
             QTimerEvent event(id);
             QCoreApplication::sendEvent(receiver, &event);
         }
-        mNow = end;
+        m_now = end;
     }
     // Returns the number of running timers.
-    int running() const { return static_cast<int>(mTimers.size()); }
+    int running() const { return static_cast<int>(m_timers.size()); }
 
 private:
     struct Timer {
@@ -53,13 +53,13 @@ private:
     int nextUntil(qint64 end) const
     {
         int next = 0;
-        for (auto it = mTimers.cbegin(); it != mTimers.cend(); ++it)
-            if (it->due <= end && (next == 0 || it->due < mTimers[next].due))
+        for (auto it = m_timers.cbegin(); it != m_timers.cend(); ++it)
+            if (it->due <= end && (next == 0 || it->due < m_timers[next].due))
                 next = it.key();
         return next;
     }
 
-    QMap<int, Timer> mTimers;
-    qint64 mNow = 0;
-    int mLastId = 1 << 24; // above the ids of Qt's own timers
+    QMap<int, Timer> m_timers;
+    qint64 m_now = 0;
+    int m_lastId = 1 << 24; // above the ids of Qt's own timers
 };

@@ -70,30 +70,30 @@ int filesBelow(const QString& folder)
 
 } // namespace
 
-OperatorSession::OperatorSession(const QString& titleRoot) : mRoot(titleRoot)
+OperatorSession::OperatorSession(const QString& titleRoot) : m_root(titleRoot)
 {
-    if (!mSiblings.listenOnFreePorts())
+    if (!m_siblings.listenOnFreePorts())
         return;
     APPEventFilter::instance();
     Q_INIT_RESOURCE(UILibrary);
     Q_INIT_RESOURCE(TitlerToolResource);
-    mWindow = std::make_unique<TitlerWindow>(true, nullptr);
-    pMainWindow = mWindow.get();
-    mWindow->setRealClose(false);
-    mList = mWindow->findChild<ArchiveList*>();
-    mScene = mWindow->findChild<CanvasScene*>();
-    mFolders = mWindow->findChild<FolderPicker*>();
-    mTemplates = mWindow->findChild<TemplatePicker*>();
+    m_window = std::make_unique<TitlerWindow>(true, nullptr);
+    pMainWindow = m_window.get();
+    m_window->setRealClose(false);
+    m_list = m_window->findChild<ArchiveList*>();
+    m_scene = m_window->findChild<CanvasScene*>();
+    m_folders = m_window->findChild<FolderPicker*>();
+    m_templates = m_window->findChild<TemplatePicker*>();
     // Nobody looks: what they would paint costs more than all the rest.
-    for (QWidget* widget : {static_cast<QWidget*>(mWindow.get()), static_cast<QWidget*>(mFolders),
-                            static_cast<QWidget*>(mTemplates)})
+    for (QWidget* widget : {static_cast<QWidget*>(m_window.get()), static_cast<QWidget*>(m_folders),
+                            static_cast<QWidget*>(m_templates)})
         widget->setUpdatesEnabled(false);
     watchDialogs();
 }
 
 OperatorSession::~OperatorSession()
 {
-    mWindow.reset();
+    m_window.reset();
     pMainWindow = nullptr;
     APPEventFilter::release();
 }
@@ -103,29 +103,29 @@ OperatorSession::~OperatorSession()
 void OperatorSession::watchDialogs()
 {
     QTimer::singleShot(DIALOG_WATCH, this, &OperatorSession::watchDialogs);
-    if (mTemplates->isVisible()) {
-        if (auto action = std::exchange(mInTemplates, nullptr))
+    if (m_templates->isVisible()) {
+        if (auto action = std::exchange(m_inTemplates, nullptr))
             action();
-        if (mTemplates->isVisible())
-            mTemplates->reject();
-    } else if (mFolders->isVisible()) {
-        if (auto action = std::exchange(mInFolders, nullptr))
+        if (m_templates->isVisible())
+            m_templates->reject();
+    } else if (m_folders->isVisible()) {
+        if (auto action = std::exchange(m_inFolders, nullptr))
             action();
         else
-            mFolders->done(QDialog::Rejected);
+            m_folders->done(QDialog::Rejected);
     }
 }
 
 void OperatorSession::step(const char* name, const std::function<void()>& action,
                            const Journal::Folders& foreseen)
 {
-    report("begin", name, foreseen.isEmpty() ? mKnown : foreseen);
+    report("begin", name, foreseen.isEmpty() ? m_known : foreseen);
     QElapsedTimer clock;
     clock.start();
     action();
     settle();
     noteList();
-    report("done", name, mKnown);
+    report("done", name, m_known);
     if (qEnvironmentVariableIsSet("FAULTS_TIMES"))
         fprintf(stderr, "%5lld ms %s\n", static_cast<long long>(clock.elapsed()), name);
 }
@@ -144,7 +144,7 @@ QJsonArray OperatorSession::told() const
 {
     QJsonArray numbers;
     for (QByteArray arguments :
-         mSiblings.argumentsOf(MESSAGE_CENTER, MessageCenterRemoteProxy::METHOD_postMessage)) {
+         m_siblings.argumentsOf(MESSAGE_CENTER, MessageCenterRemoteProxy::METHOD_postMessage)) {
         MessageDefine::_tagMessageParam message;
         MessageCenterParams::deserialize_postMessage_param(message, arguments.data(), long(arguments.size()));
         numbers.append(message.messageId);
@@ -155,25 +155,25 @@ QJsonArray OperatorSession::told() const
 // The open folder as its list shows it.
 void OperatorSession::noteList()
 {
-    if (mOpen.isEmpty() || mList->getCurrentPath() != mRoot + '/' + mOpen)
+    if (m_open.isEmpty() || m_list->getCurrentPath() != m_root + '/' + m_open)
         return;
     QStringList order;
-    for (int row = 0; row < mList->count(); ++row)
-        order.append(QFileInfo(mList->archiveItem(row)->getArchiveDataPath()).completeBaseName());
-    mKnown[mOpen].order = order;
+    for (int row = 0; row < m_list->count(); ++row)
+        order.append(QFileInfo(m_list->archiveItem(row)->getArchiveDataPath()).completeBaseName());
+    m_known[m_open].order = order;
 }
 
 // Until the pictures are written and on the disk, as far as it takes them.
 void OperatorSession::settle()
 {
-    const QDeadlineTimer limit(mIsSlow ? SETTLE_TIMEOUT_LATER : SETTLE_TIMEOUT);
+    const QDeadlineTimer limit(m_isSlow ? SETTLE_TIMEOUT_LATER : SETTLE_TIMEOUT);
     for (;;) {
         QCoreApplication::processEvents();
         QCoreApplication::sendPostedEvents(nullptr, QEvent::DeferredDelete);
-        if (mWindow->dataSaveIsFinished())
+        if (m_window->dataSaveIsFinished())
             break;
         if (limit.hasExpired()) {
-            mIsSlow = true;
+            m_isSlow = true;
             break;
         }
         QThread::msleep(2);
@@ -184,15 +184,15 @@ void OperatorSession::settle()
 
 void OperatorSession::request(const QString& folder)
 {
-    mOpen = folder;
-    mWindow->showTitlerWindow({_titler_paramter::CREATE_OR_EDIT, (mRoot + '/' + folder).toStdWString()});
+    m_open = folder;
+    m_window->showTitlerWindow({_titler_paramter::CREATE_OR_EDIT, (m_root + '/' + folder).toStdWString()});
 }
 
 void OperatorSession::makePictures()
 {
     request(FOLDER);
     settle();
-    for (int row = 0; row < mList->count(); ++row) {
+    for (int row = 0; row < m_list->count(); ++row) {
         tap(row);
         type(1, QStringLiteral("!"));
         leaveText();
@@ -204,15 +204,15 @@ void OperatorSession::makePictures()
 void OperatorSession::play(bool healBeforeClose)
 {
     for (const QString& stem : STEMS)
-        mKnown[FOLDER].texts[stem] = QStringList{stem + '!'};
-    mKnown[FOLDER].order = STEMS;
+        m_known[FOLDER].texts[stem] = QStringList{stem + '!'};
+    m_known[FOLDER].order = STEMS;
     FaultShim::start();
     inEditor(healBeforeClose);
     if (healBeforeClose)
         FaultShim::start();
     inFolderPicker(healBeforeClose);
     FaultShim::stop();
-    mIsSlow = false;
+    m_isSlow = false;
     Journal::write({{"played", true}});
 }
 
@@ -221,38 +221,38 @@ void OperatorSession::inEditor(bool healBeforeClose)
 {
     step("open", [this] { request(FOLDER); });
     const auto typed = [this](int row, const QString& stem, const QString& text) {
-        const QStringList texts{mKnown[FOLDER].texts.value(stem).value(0) + text};
+        const QStringList texts{m_known[FOLDER].texts.value(stem).value(0) + text};
         step(
             "type",
             [this, row, stem, text, texts] {
                 tap(row);
                 type(1, text);
                 leaveText();
-                mKnown[FOLDER].texts[stem] = texts;
+                m_known[FOLDER].texts[stem] = texts;
             },
             withTexts(stem, texts));
     };
     typed(0, STEMS.at(0), QStringLiteral(" one"));
     typed(1, STEMS.at(1), QStringLiteral(" two"));
     step("copy and paste", [this] {
-        const QStringList before = mKnown[FOLDER].order;
+        const QStringList before = m_known[FOLDER].order;
         choose(ArchiveAction::ACTION_COPY, 0);
         choose(ArchiveAction::ACTION_PASTE, 0);
-        noteNewTitle(before, mKnown[FOLDER].texts.value(STEMS.at(0)));
+        noteNewTitle(before, m_known[FOLDER].texts.value(STEMS.at(0)));
     });
     for (const bool ofUser : {false, true}) {
         step(ofUser ? "create from a user's template" : "create from a preset", [this, ofUser] {
-            const QStringList before = mKnown[FOLDER].order;
-            mInTemplates = [this, ofUser] { takeTemplate(ofUser); };
+            const QStringList before = m_known[FOLDER].order;
+            m_inTemplates = [this, ofUser] { takeTemplate(ofUser); };
             choose(ArchiveAction::ACTION_CREATE, 0);
             noteNewTitle(before, {ofUser ? USER_TEXT : PRESET_TEXT});
         });
     }
-    Journal::Folders without = mKnown;
+    Journal::Folders without = m_known;
     without[FOLDER].order.removeOne(STEMS.at(2));
     step(
         "delete",
-        [this] { choose(ArchiveAction::ACTION_DELETE, int(mKnown[FOLDER].order.indexOf(STEMS.at(2)))); },
+        [this] { choose(ArchiveAction::ACTION_DELETE, int(m_known[FOLDER].order.indexOf(STEMS.at(2)))); },
         without);
     step("move", [this] { move(0, 2); });
     step("save as template", [this] { choose(ArchiveAction::ACTION_ADD_USER, 0); });
@@ -263,68 +263,68 @@ void OperatorSession::inEditor(bool healBeforeClose)
 void OperatorSession::inFolderPicker(bool healBeforeClose)
 {
     step("make a folder", [this] {
-        const QStringList before = mKnown.value(MADE_FOLDER).order;
-        mInFolders = [this] {
+        const QStringList before = m_known.value(MADE_FOLDER).order;
+        m_inFolders = [this] {
             makeFolder(MADE_FOLDER);
-            mInFolders = [this] {
-                mOpen = MADE_FOLDER;
-                mInTemplates = [this] { takeTemplate(false); };
-                mFolders->openFolder();
+            m_inFolders = [this] {
+                m_open = MADE_FOLDER;
+                m_inTemplates = [this] { takeTemplate(false); };
+                m_folders->openFolder();
             };
         };
-        mWindow->showTitlerWindow({_titler_paramter::SUB_PANEL, {}});
+        m_window->showTitlerWindow({_titler_paramter::SUB_PANEL, {}});
         settle();
-        if (QFileInfo(mRoot + '/' + MADE_FOLDER).isDir())
-            mKnown[MADE_FOLDER];
+        if (QFileInfo(m_root + '/' + MADE_FOLDER).isDir())
+            m_known[MADE_FOLDER];
         noteNewTitle(before, {PRESET_TEXT});
     });
     step("close", [this, healBeforeClose] { close(healBeforeClose); });
     step("duplicate and rename folders", [this, healBeforeClose] {
-        mInFolders = [this] {
+        m_inFolders = [this] {
             const QModelIndex source = rowOf(FOLDER);
             if (!source.isValid())
                 return;
-            mFolders->treeView()->setCurrentIndex(source);
-            mFolders->duplicateFolder();
+            m_folders->treeView()->setCurrentIndex(source);
+            m_folders->duplicateFolder();
             nameFolder(COPIED_FOLDER);
-            mInFolders = [this] {
+            m_inFolders = [this] {
                 const QModelIndex row = rowOf(MADE_FOLDER);
                 if (!row.isValid())
                     return;
-                mFolders->treeView()->setCurrentIndex(row);
-                mFolders->startEditing(row);
+                m_folders->treeView()->setCurrentIndex(row);
+                m_folders->startEditing(row);
                 nameFolder(RENAMED_FOLDER);
             };
         };
-        mWindow->showTitlerWindow({_titler_paramter::SUB_PANEL, {}});
+        m_window->showTitlerWindow({_titler_paramter::SUB_PANEL, {}});
         settle();
         if (rowOf(COPIED_FOLDER).isValid())
-            mKnown[COPIED_FOLDER] = mKnown.value(FOLDER);
-        if (rowOf(RENAMED_FOLDER).isValid() && mKnown.contains(MADE_FOLDER))
-            mKnown[RENAMED_FOLDER] = mKnown.take(MADE_FOLDER);
+            m_known[COPIED_FOLDER] = m_known.value(FOLDER);
+        if (rowOf(RENAMED_FOLDER).isValid() && m_known.contains(MADE_FOLDER))
+            m_known[RENAMED_FOLDER] = m_known.take(MADE_FOLDER);
         close(healBeforeClose);
     });
 }
 
 void OperatorSession::look()
 {
-    const QStringList folders = QDir(mRoot).entryList(QDir::Dirs | QDir::NoDotAndDotDot, QDir::Name);
+    const QStringList folders = QDir(m_root).entryList(QDir::Dirs | QDir::NoDotAndDotDot, QDir::Name);
     for (const QString& folder : folders) {
         // An operator who finds the folder empty makes a first title.
-        mInTemplates = [this] { takeTemplate(false); };
+        m_inTemplates = [this] { takeTemplate(false); };
         request(folder);
         settle();
         noteList();
-        for (int row = 0; row < mList->count(); ++row) {
+        for (int row = 0; row < m_list->count(); ++row) {
             tap(row);
             settle();
         }
-        if (mList->count() > 0)
+        if (m_list->count() > 0)
             tap(0);
         close(false);
-        mInTemplates = nullptr;
+        m_inTemplates = nullptr;
     }
-    Journal::write({{"looked", true}, {"folders", Journal::toJson(mKnown)}, {"told", told()}});
+    Journal::write({{"looked", true}, {"folders", Journal::toJson(m_known)}, {"told", told()}});
 }
 
 void OperatorSession::soak(int sessions)
@@ -335,7 +335,7 @@ void OperatorSession::soak(int sessions)
         for (int row = 0; row < 2; ++row) {
             tap(row);
             // Longer and shorter by turns, so that the titles stay what they are.
-            GraphicsText* item = mScene->findTextItem(1);
+            GraphicsText* item = m_scene->findTextItem(1);
             if (!item)
                 continue;
             item->setTextInteractionFlags(Qt::TextEditorInteraction);
@@ -352,13 +352,13 @@ void OperatorSession::soak(int sessions)
                             {"kilobytes", double(residentKilobytes())},
                             {"descriptors", int(QDir("/proc/self/fd").count())},
                             {"threads", int(QDir("/proc/self/task").count())},
-                            {"files", filesBelow(QFileInfo(mRoot).path())}});
+                            {"files", filesBelow(QFileInfo(m_root).path())}});
     }
 }
 
 void OperatorSession::end()
 {
-    mWindow->endProcess();
+    m_window->endProcess();
 }
 
 // Whatever is asked, the operator wants to close.
@@ -367,30 +367,30 @@ void OperatorSession::close(bool healFirst)
     if (healFirst)
         FaultShim::stop();
     settle();
-    for (int attempt = 0; attempt < CLOSE_ATTEMPTS && mWindow->isVisible(); ++attempt) {
-        mWindow->closeTitlerWindow();
+    for (int attempt = 0; attempt < CLOSE_ATTEMPTS && m_window->isVisible(); ++attempt) {
+        m_window->closeTitlerWindow();
         settle();
         for (const auto answer : {MessageDefine::CLOSE_OK, MessageDefine::CLOSE_CANCEL}) {
-            if (!mWindow->isVisible())
+            if (!m_window->isVisible())
                 break;
-            mWindow->continueCloseTitler({1, answer, MessageDef::MESSAGE_CONFIRM_CLOSE});
+            m_window->continueCloseTitler({1, answer, MessageDef::MESSAGE_CONFIRM_CLOSE});
             settle();
         }
     }
-    if (mWindow->isVisible())
+    if (m_window->isVisible())
         Journal::write({{"wrong", "the window does not close"}});
-    mOpen.clear();
+    m_open.clear();
 }
 
 void OperatorSession::tap(int row)
 {
-    if (ArchiveItem* item = mList->archiveItem(row))
-        Q_EMIT mList->widgetItemReleased(item, QPoint(300, 60), mList);
+    if (ArchiveItem* item = m_list->archiveItem(row))
+        Q_EMIT m_list->widgetItemReleased(item, QPoint(300, 60), m_list);
 }
 
 void OperatorSession::type(int id, const QString& text)
 {
-    GraphicsText* item = mScene->findTextItem(id);
+    GraphicsText* item = m_scene->findTextItem(id);
     if (!item)
         return;
     item->setTextInteractionFlags(Qt::TextEditorInteraction);
@@ -401,60 +401,60 @@ void OperatorSession::type(int id, const QString& text)
 
 void OperatorSession::leaveText()
 {
-    mWindow->hideSoftWareWithDeleteEmptyItems();
+    m_window->hideSoftWareWithDeleteEmptyItems();
 }
 
 void OperatorSession::choose(ArchiveAction::ARCHIVE_ACTION_TYPE type, int row)
 {
-    mList->itemRightPressedEvent(mList->archiveItem(row), QPoint(20, 20), mList);
-    ArchiveAction* action = mList->findChild<ArchiveMenu*>()->action(type);
-    mList->slotHideOptionMenu();
+    m_list->itemRightPressedEvent(m_list->archiveItem(row), QPoint(20, 20), m_list);
+    ArchiveAction* action = m_list->findChild<ArchiveMenu*>()->action(type);
+    m_list->slotHideOptionMenu();
     if (action->isEnabled())
-        mList->selectOptionMenuItem(action);
+        m_list->selectOptionMenuItem(action);
 }
 
 void OperatorSession::move(int from, int to)
 {
-    if (mList->count() <= std::max(from, to))
+    if (m_list->count() <= std::max(from, to))
         return;
     leaveText();
-    mWindow->editAndDoneButtonClicked();
-    ArchiveItem* item = mList->archiveItem(from);
-    Q_EMIT mList->signalDragOneItem(item, from, mList);
-    mList->removeWidgetItem(item);
-    mList->addWidgetItem(item, to);
-    Q_EMIT mList->signalItemDrop();
-    mWindow->editAndDoneButtonClicked();
+    m_window->editAndDoneButtonClicked();
+    ArchiveItem* item = m_list->archiveItem(from);
+    Q_EMIT m_list->signalDragOneItem(item, from, m_list);
+    m_list->removeWidgetItem(item);
+    m_list->addWidgetItem(item, to);
+    Q_EMIT m_list->signalItemDrop();
+    m_window->editAndDoneButtonClicked();
 }
 
 void OperatorSession::takeTemplate(bool ofUser)
 {
-    mTemplates->findChild<QTabWidget*>()->setCurrentIndex(ofUser ? 1 : 0);
-    TemplateTab* tab = ofUser ? mTemplates->userTab() : mTemplates->presetTab();
+    m_templates->findChild<QTabWidget*>()->setCurrentIndex(ofUser ? 1 : 0);
+    TemplateTab* tab = ofUser ? m_templates->userTab() : m_templates->presetTab();
     if (tab->count() == 0)
         return;
     tab->select(tab->item(0));
-    mTemplates->findChild<KSPushbutton*>(ofUser ? "selectUserButton" : "selectPresetButton")->click();
+    m_templates->findChild<KSPushbutton*>(ofUser ? "selectUserButton" : "selectPresetButton")->click();
 }
 
 void OperatorSession::makeFolder(const QString& name)
 {
-    mFolders->createFolder();
+    m_folders->createFolder();
     nameFolder(name);
 }
 
 void OperatorSession::nameFolder(const QString& name)
 {
     QCoreApplication::sendPostedEvents();
-    if (FolderEditor* editor = mFolders->editor()) {
+    if (FolderEditor* editor = m_folders->editor()) {
         editor->setText(name);
-        mFolders->slotPressedEnter();
+        m_folders->slotPressedEnter();
     }
 }
 
 QModelIndex OperatorSession::rowOf(const QString& folder) const
 {
-    const KSTreeModel* model = mFolders->treeModel();
+    const KSTreeModel* model = m_folders->treeModel();
     for (int row = 0; row < model->rowCount(); ++row)
         if (model->index(row, 0).data().toString() == folder)
             return model->index(row, 0);
@@ -464,15 +464,15 @@ QModelIndex OperatorSession::rowOf(const QString& folder) const
 void OperatorSession::noteNewTitle(const QStringList& before, const QStringList& texts)
 {
     noteList();
-    const QString folder = mOpen;
-    for (const QString& stem : mKnown.value(folder).order)
+    const QString folder = m_open;
+    for (const QString& stem : m_known.value(folder).order)
         if (!before.contains(stem))
-            mKnown[folder].texts[stem] = texts;
+            m_known[folder].texts[stem] = texts;
 }
 
 Journal::Folders OperatorSession::withTexts(const QString& stem, const QStringList& texts) const
 {
-    Journal::Folders folders = mKnown;
+    Journal::Folders folders = m_known;
     folders[FOLDER].texts[stem] = texts;
     return folders;
 }

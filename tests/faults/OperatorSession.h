@@ -37,7 +37,7 @@ public:
     // titleRoot: the folder that contains the title folders. isReady() returns false when no ports are free.
     explicit OperatorSession(const QString& titleRoot);
     ~OperatorSession() override;
-    bool isReady() const { return mWindow != nullptr; }
+    bool isReady() const { return m_window != nullptr; }
 
     // Types a first text into each title, so that its pictures are made.
     void makePictures();
@@ -72,22 +72,22 @@ private:
     void makeFolder(const QString& name);
     void nameFolder(const QString& name);
     QModelIndex rowOf(const QString& folder) const;
-    // Adds the texts of a new title of the open folder to mKnown, if there is one.
+    // Adds the texts of a new title of the open folder to m_known, if there is one.
     void noteNewTitle(const QStringList& before, const QStringList& texts);
     Journal::Folders withTexts(const QString& stem, const QStringList& texts) const;
 
     void watchDialogs();
 
-    QString mRoot;
-    Siblings mSiblings;
-    std::unique_ptr<TitlerWindow> mWindow;
-    ArchiveList* mList = nullptr;
-    CanvasScene* mScene = nullptr;
-    FolderPicker* mFolders = nullptr;
-    TemplatePicker* mTemplates = nullptr;
-    std::function<void()> mInFolders;
-    std::function<void()> mInTemplates;
-    QString mOpen;           // name of the open folder
-    bool mIsSlow = false;    // whether something was not saved in time
-    Journal::Folders mKnown; // as last seen by the operator
+    QString m_root;
+    Siblings m_siblings;
+    std::unique_ptr<TitlerWindow> m_window;
+    ArchiveList* m_list = nullptr;
+    CanvasScene* m_scene = nullptr;
+    FolderPicker* m_folders = nullptr;
+    TemplatePicker* m_templates = nullptr;
+    std::function<void()> m_inFolders;
+    std::function<void()> m_inTemplates;
+    QString m_open;           // name of the open folder
+    bool m_isSlow = false;    // whether something was not saved in time
+    Journal::Folders m_known; // as last seen by the operator
 };

@@ -14,7 +14,7 @@ class tst_gallerypages_interruptions : public QObject
 private Q_SLOTS:
     void cleanup()
     {
-        mPage.close();
+        m_page.close();
         APPEventFilter::release();
     }
     void everyWidget_data();
@@ -25,33 +25,33 @@ private:
     void open(int page);
     void destroy(QWidget* widget);
 
-    ManualClock mClock; // before all widgets
-    GalleryPage mPage;
+    ManualClock m_clock; // before all widgets
+    GalleryPage m_page;
     static inline QStringList s_names;
 };
 
 // The page as new, with what it opens, and no finger on it.
 void tst_gallerypages_interruptions::open(int page)
 {
-    mPage.close();
-    mPage = GalleryPages::all().at(page)();
-    mPage.show();
+    m_page.close();
+    m_page = GalleryPages::all().at(page)();
+    m_page.show();
     QCoreApplication::processEvents();
     Fingers posing;
-    mPage.pose(posing);
+    m_page.pose(posing);
     posing.cancel();
     QCoreApplication::processEvents();
-    mClock.advance(5000);
+    m_clock.advance(5000);
 }
 
 // A row alone, anything else with all that it is a part of.
 void tst_gallerypages_interruptions::destroy(QWidget* widget)
 {
-    if (widget->window() != mPage.window.get() || widget->isWindow()) {
-        mPage.close();
+    if (widget->window() != m_page.window.get() || widget->isWindow()) {
+        m_page.close();
         return;
     }
-    while (!qobject_cast<KSBaseItemWidget*>(widget) && widget->parentWidget() != mPage.window.get())
+    while (!qobject_cast<KSBaseItemWidget*>(widget) && widget->parentWidget() != m_page.window.get())
         widget = widget->parentWidget();
     delete widget;
 }
@@ -68,7 +68,7 @@ void tst_gallerypages_interruptions::everyWidget_data()
 void tst_gallerypages_interruptions::everyWidget()
 {
     QFETCH(int, page);
-    Interruptions touches(mClock);
+    Interruptions touches(m_clock);
     touches.restore = [this, page] { open(page); };
     touches.destroy = [this](QWidget* widget) { destroy(widget); };
     QStringList result;

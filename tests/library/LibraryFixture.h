@@ -31,8 +31,8 @@ public:
     LibraryFixture()
     {
         qputenv("K2SYS_AC_ROOT", "");
-        qputenv("K2SYS_AC_DATA", mDir.path().toLocal8Bit());
-        const QString base = mDir.path() + QStringLiteral("/defaultuser/");
+        qputenv("K2SYS_AC_DATA", m_dir.path().toLocal8Bit());
+        const QString base = m_dir.path() + QStringLiteral("/defaultuser/");
         QDir().mkpath(base);
         QFile paths(base + QStringLiteral("PathInfo.xml"));
         if (paths.open(QIODevice::WriteOnly))
@@ -57,7 +57,7 @@ public:
         return image;
     }
 
-    QString titleRoot() const { return mDir.path() + QStringLiteral("/defaultuser/titles"); }
+    QString titleRoot() const { return m_dir.path() + QStringLiteral("/defaultuser/titles"); }
 
     QString makeFolder(const QString& name)
     {
@@ -145,7 +145,7 @@ public:
     }
 
 private:
-    QTemporaryDir mDir;
+    QTemporaryDir m_dir;
 };
 
 using Reports = QList<QPair<int, QString>>;

@@ -32,7 +32,7 @@ public:
         }
         for (const char* set : {"/templates_en", "/templates_chs"})
             QDir().mkpath(presetRoot() + QLatin1String(set));
-        mAge = 0;
+        m_age = 0;
     }
 
     // Makes presets with these stems, the only ones listed in the order file of the set.
@@ -72,7 +72,7 @@ public:
         makeUserPictures(name);
         QFile file(userTitle(name));
         if (file.open(QIODevice::ReadWrite))
-            file.setFileTime(QDateTime::fromSecsSinceEpoch(1000 + ++mAge), QFile::FileModificationTime);
+            file.setFileTime(QDateTime::fromSecsSinceEpoch(1000 + ++m_age), QFile::FileModificationTime);
     }
 
     void makeUserTemplates(int count)
@@ -109,5 +109,5 @@ private:
         return image;
     }
 
-    int mAge = 0;
+    int m_age = 0;
 };

@@ -32,10 +32,10 @@ public:
     static constexpr int TICK = 33;             // ms between two steps of a flick
     static constexpr int EDGE_SCROLL_TIME = 40; // ms
 
-    explicit TitleListFixture(TouchDevice& device) : mDevice(device)
+    explicit TitleListFixture(TouchDevice& device) : m_device(device)
     {
-        mFilter.registerLockObject(&mFilter, nullptr, LOCKOBJECT_DEFAULTMUTEX, nullptr);
-        QCoreApplication::instance()->installEventFilter(&mFilter);
+        m_filter.registerLockObject(&m_filter, nullptr, LOCKOBJECT_DEFAULTMUTEX, nullptr);
+        QCoreApplication::instance()->installEventFilter(&m_filter);
         window.setGeometry(0, 0, 1200, 1080);
         KSScrollViewerWidget::s_mainWnd = &window;
         KSMenu::setMainWindow(&window);
@@ -55,7 +55,7 @@ public:
     ~TitleListFixture() override
     {
         stack.clear();
-        QCoreApplication::instance()->removeEventFilter(&mFilter);
+        QCoreApplication::instance()->removeEventFilter(&m_filter);
         KSScrollViewerWidget::s_mainWnd.clear();
         KSMenu::setMainWindow(nullptr);
     }
@@ -121,7 +121,7 @@ public:
         ArchiveMenu* open = menu();
         const QPoint row =
             open->getMenuItemRect(static_cast<int>(open->actions().indexOf(open->action(type)))).center();
-        mDevice.tap(open, row);
+        m_device.tap(open, row);
     }
     void holdAndChoose(int row, ArchiveAction::ARCHIVE_ACTION_TYPE type)
     {
@@ -140,11 +140,11 @@ public:
             result.append(QFileInfo(item(i)->getArchiveDataPath()).completeBaseName());
         return result;
     }
-    bool isLocked() const { return !const_cast<KSAppEventFilter&>(mFilter).activateLockObjects().isEmpty(); }
+    bool isLocked() const { return !const_cast<KSAppEventFilter&>(m_filter).activateLockObjects().isEmpty(); }
     QStringList takeCanvas() { return std::exchange(canvas, {}); }
 
     ManualClock clock; // declared before all widgets, which use it
-    KSAppEventFilter mFilter;
+    KSAppEventFilter m_filter;
     QUndoStack stack;
     QLabel label;
     QWidget window;
@@ -152,7 +152,7 @@ public:
     QStringList canvas;          // stems sent to the canvas; "null" for none
 
 private:
-    QTest::QTouchEventWidgetSequence touch() { return QTest::touchEvent(&window, mDevice); }
+    QTest::QTouchEventWidgetSequence touch() { return QTest::touchEvent(&window, m_device); }
 
-    TouchDevice& mDevice;
+    TouchDevice& m_device;
 };

@@ -25,12 +25,12 @@ private Q_SLOTS:
     void undoThreadOpensThePickerOnce();
 
 private:
-    LibraryFixture mFixture;
+    LibraryFixture m_fixture;
 };
 
 void tst_archiveinitthread::loaderHandsItsTitlesOver()
 {
-    const QString folder = mFixture.makeFolder(QStringLiteral("loader"));
+    const QString folder = m_fixture.makeFolder(QStringLiteral("loader"));
     LibraryFixture::fillFolder(folder, {QStringLiteral("b"), QStringLiteral("a")});
     QList<Archive*> taken;
     QThread* takenIn = nullptr;
@@ -55,7 +55,7 @@ void tst_archiveinitthread::loaderHandsItsTitlesOver()
 
 void tst_archiveinitthread::loaderKeepsWhatNobodyTakes()
 {
-    const QString folder = mFixture.makeFolder(QStringLiteral("untaken"));
+    const QString folder = m_fixture.makeFolder(QStringLiteral("untaken"));
     LibraryFixture::fillFolder(folder, {QStringLiteral("a")});
     ArchiveInitThread loader(folder);
     loader.start(QThread::InheritPriority);
@@ -73,7 +73,7 @@ void tst_archiveinitthread::loaderOfAMissingFolderGivesNothing()
 
 void tst_archiveinitthread::cancelledLoaderAnnouncesNothing()
 {
-    const QString folder = mFixture.makeFolder(QStringLiteral("cancelled"));
+    const QString folder = m_fixture.makeFolder(QStringLiteral("cancelled"));
     LibraryFixture::fillFolder(folder, {QStringLiteral("a")});
     ArchiveInitThread loader(folder);
     QSignalSpy spy(&loader, &ArchiveInitThread::threadGetArchiveListFinished);
@@ -85,7 +85,7 @@ void tst_archiveinitthread::cancelledLoaderAnnouncesNothing()
 
 void tst_archiveinitthread::sceneThreadWritesCopiesInOrder()
 {
-    const QString folder = mFixture.makeFolder(QStringLiteral("scene thread"));
+    const QString folder = m_fixture.makeFolder(QStringLiteral("scene thread"));
     auto archive = LibraryFixture::makeRecord(folder, QStringLiteral("t"), QStringLiteral("first"));
     SceneThread thread;
     thread.addArchive(nullptr);
@@ -107,7 +107,7 @@ void tst_archiveinitthread::sceneThreadWritesCopiesInOrder()
 
 void tst_archiveinitthread::sceneThreadPassesOverTitlesWithoutAPath()
 {
-    const QString folder = mFixture.makeFolder(QStringLiteral("no path"));
+    const QString folder = m_fixture.makeFolder(QStringLiteral("no path"));
     const Archive blank;
     const auto archive = LibraryFixture::makeRecord(folder, QStringLiteral("t"), QStringLiteral("text"));
     SceneThread thread;

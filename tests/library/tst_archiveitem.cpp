@@ -15,7 +15,7 @@ class tst_archiveitem : public QObject
 private Q_SLOTS:
     void initTestCase();
     void init();
-    void cleanup() { mItem.reset(); }
+    void cleanup() { m_item.reset(); }
     void oneTextRunsOverTheLines();
     void wordLongerThanALine();
     void onlyTheLastLineIsElided();
@@ -23,15 +23,15 @@ private Q_SLOTS:
 
 private:
     void show(const QString& text);
-    QList<QLabel*> labels() const { return mItem->getRightChild()->findChildren<QLabel*>(); }
+    QList<QLabel*> labels() const { return m_item->getRightChild()->findChildren<QLabel*>(); }
     static bool fits(const QLabel& label)
     {
         return QFontMetricsF(label.font()).horizontalAdvance(label.text()) <= label.contentsRect().width();
     }
 
-    LibraryFixture mFixture;
-    Archive mArchive;
-    std::unique_ptr<ArchiveItem> mItem;
+    LibraryFixture m_fixture;
+    Archive m_archive;
+    std::unique_ptr<ArchiveItem> m_item;
 };
 
 namespace
@@ -49,25 +49,25 @@ void tst_archiveitem::initTestCase()
 
 void tst_archiveitem::init()
 {
-    mItem = std::make_unique<ArchiveItem>(&mArchive, ArchiveItem::LIST_ITEM);
-    mItem->setDragFlagAlignment(DRAGFLAG_RIGHT);
+    m_item = std::make_unique<ArchiveItem>(&m_archive, ArchiveItem::LIST_ITEM);
+    m_item->setDragFlagAlignment(DRAGFLAG_RIGHT);
 }
 
 void tst_archiveitem::show(const QString& text)
 {
-    mArchive.releaseVectorText();
-    mArchive.setText({LibraryFixture::makeText(text, 1)});
-    if (mItem->hasChildWidgets())
-        mItem->updateRightChild();
+    m_archive.releaseVectorText();
+    m_archive.setText({LibraryFixture::makeText(text, 1)});
+    if (m_item->hasChildWidgets())
+        m_item->updateRightChild();
     else
-        mItem->initArchiveItemChildWidget();
+        m_item->initArchiveItemChildWidget();
 }
 
 void tst_archiveitem::oneTextRunsOverTheLines()
 {
     const QString text = QStringLiteral("The council votes tonight on the new bridge");
     show(text);
-    const QStringList lines = textLines(mItem.get());
+    const QStringList lines = textLines(m_item.get());
     QVERIFY(!lines.at(1).isEmpty());
     QVERIFY2(!lines.join(QString()).contains(ELLIPSIS), qPrintable(lines.join('|')));
     QCOMPARE(lines.join(' ').simplified(), text); // no word is lost or cut
@@ -79,16 +79,16 @@ void tst_archiveitem::wordLongerThanALine()
 {
     const QString text = QStringLiteral("快讯快讯快讯快讯快讯快讯快讯快讯快讯快讯");
     show(text);
-    QCOMPARE(textLines(mItem.get()).join(QString()), text);
+    QCOMPARE(textLines(m_item.get()).join(QString()), text);
     show(QString(30, QLatin1Char('W')));
-    QCOMPARE(textLines(mItem.get()).join(QString()), QString(30, QLatin1Char('W')));
+    QCOMPARE(textLines(m_item.get()).join(QString()), QString(30, QLatin1Char('W')));
 }
 
 void tst_archiveitem::onlyTheLastLineIsElided()
 {
     const QString text = QStringLiteral("word ").repeated(60).trimmed();
     show(text);
-    QStringList lines = textLines(mItem.get());
+    QStringList lines = textLines(m_item.get());
     QCOMPARE(lines.size(), 4);
     QVERIFY2(lines.last().endsWith(ELLIPSIS), qPrintable(lines.last()));
     lines.last().chop(1);
@@ -101,12 +101,12 @@ void tst_archiveitem::onlyTheLastLineIsElided()
 void tst_archiveitem::handleStandsBesideTheText()
 {
     show(QStringLiteral("word ").repeated(60));
-    const QStringList before = textLines(mItem.get());
-    mItem->setDragFlag(true);
-    const auto* handle = mItem->findChild<QLabel*>(QString(), Qt::FindDirectChildrenOnly);
+    const QStringList before = textLines(m_item.get());
+    m_item->setDragFlag(true);
+    const auto* handle = m_item->findChild<QLabel*>(QString(), Qt::FindDirectChildrenOnly);
     QVERIFY(handle);
     for (const QLabel* label : labels()) {
-        const QRect line(label->mapTo(mItem.get(), QPoint(0, 0)), label->size());
+        const QRect line(label->mapTo(m_item.get(), QPoint(0, 0)), label->size());
         QVERIFY2(!line.intersects(handle->geometry()), qPrintable(label->text()));
         QVERIFY2(fits(*label), qPrintable(label->text()));
     }
@@ -115,8 +115,8 @@ void tst_archiveitem::handleStandsBesideTheText()
     for (const QLabel* label : labels())
         QVERIFY2(fits(*label), qPrintable(label->text()));
     show(QStringLiteral("word ").repeated(60));
-    mItem->setDragFlag(false);
-    QCOMPARE(textLines(mItem.get()), before);
+    m_item->setDragFlag(false);
+    QCOMPARE(textLines(m_item.get()), before);
 }
 
 QTEST_MAIN(tst_archiveitem)

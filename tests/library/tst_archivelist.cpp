@@ -62,12 +62,12 @@ private Q_SLOTS:
     void language();
 
 private:
-    ArchiveItem* item(int index) { return mList->archiveItem(index); }
+    ArchiveItem* item(int index) { return m_list->archiveItem(index); }
     QStringList stems() const
     {
         QStringList result;
-        for (int i = 0; i < mList->count(); ++i)
-            result.append(QFileInfo(mList->archiveItem(i)->getArchiveDataPath()).completeBaseName());
+        for (int i = 0; i < m_list->count(); ++i)
+            result.append(QFileInfo(m_list->archiveItem(i)->getArchiveDataPath()).completeBaseName());
         return result;
     }
     void tap(int index)
@@ -75,7 +75,7 @@ private:
         ArchiveItem* target = item(index);
         QTest::mouseClick(target, Qt::LeftButton, Qt::NoModifier, QPoint(20, 20));
     }
-    ArchiveMenu* menu() { return mList->findChild<ArchiveMenu*>(); }
+    ArchiveMenu* menu() { return m_list->findChild<ArchiveMenu*>(); }
     // Opens the menu on the item and chooses an entry.
     void choose(int index, ArchiveAction::ARCHIVE_ACTION_TYPE type)
     {
@@ -100,55 +100,55 @@ private:
     }
     QString threeTitles(const QString& name)
     {
-        const QString folder = mFixture.makeFolder(name);
+        const QString folder = m_fixture.makeFolder(name);
         LibraryFixture::fillFolder(folder, {QStringLiteral("c"), QStringLiteral("a"), QStringLiteral("b")});
         return folder;
     }
 
-    LibraryFixture mFixture;
-    FakeEditContext mContext;
-    FakeTitlerFolderReporter mFolders;
-    FakeMessageBoxController mMessages;
-    std::unique_ptr<QLabel> mLabel;
-    std::unique_ptr<ArchiveList> mList;
-    QUndoStack mStack;
-    QList<QString> mCanvas; // stems sent to the canvas; "null" for none
+    LibraryFixture m_fixture;
+    FakeEditContext m_context;
+    FakeTitlerFolderReporter m_folders;
+    FakeMessageBoxController m_messages;
+    std::unique_ptr<QLabel> m_label;
+    std::unique_ptr<ArchiveList> m_list;
+    QUndoStack m_stack;
+    QList<QString> m_canvas; // stems sent to the canvas; "null" for none
 };
 
 void tst_archivelist::init()
 {
-    mLabel = std::make_unique<QLabel>();
-    mList = std::make_unique<ArchiveList>(mLabel.get(), false);
-    mList->setFixedSize(549, 997);
-    connect(mList.get(), &ArchiveList::focusCommandSignal, &mStack, &QUndoStack::push);
-    connect(mList.get(), &ArchiveList::signalUpdateCanvas, this, [this](const Archive* archive) {
-        mCanvas.append(archive ? QString::fromStdString(archive->getName()) : QStringLiteral("null"));
+    m_label = std::make_unique<QLabel>();
+    m_list = std::make_unique<ArchiveList>(m_label.get(), false);
+    m_list->setFixedSize(549, 997);
+    connect(m_list.get(), &ArchiveList::focusCommandSignal, &m_stack, &QUndoStack::push);
+    connect(m_list.get(), &ArchiveList::signalUpdateCanvas, this, [this](const Archive* archive) {
+        m_canvas.append(archive ? QString::fromStdString(archive->getName()) : QStringLiteral("null"));
     });
-    mList->show();
-    QVERIFY(QTest::qWaitForWindowExposed(mList.get(), PATIENCE_MS));
-    mContext.createNew = false;
-    mFolders.take();
-    mMessages.take();
-    mCanvas.clear();
+    m_list->show();
+    QVERIFY(QTest::qWaitForWindowExposed(m_list.get(), PATIENCE_MS));
+    m_context.createNew = false;
+    m_folders.take();
+    m_messages.take();
+    m_canvas.clear();
 }
 
 void tst_archivelist::cleanup()
 {
-    mStack.clear();
-    mList.reset();
+    m_stack.clear();
+    m_list.reset();
     qunsetenv("K2SYS_FS_REMAIN");
 }
 
 void tst_archivelist::opensAFolderInItsOrder()
 {
     const QString folder = threeTitles(QStringLiteral("新闻 order"));
-    QCOMPARE(mLabel->text(), QStringLiteral("Folder"));
-    mList->refreshArchiveList(folder);
-    QCOMPARE(mList->getCurrentPath(), folder);
-    QCOMPARE(mLabel->text(), QStringLiteral("新闻 order"));
+    QCOMPARE(m_label->text(), QStringLiteral("Folder"));
+    m_list->refreshArchiveList(folder);
+    QCOMPARE(m_list->getCurrentPath(), folder);
+    QCOMPARE(m_label->text(), QStringLiteral("新闻 order"));
     QCOMPARE(stems(), (QStringList{QStringLiteral("c"), QStringLiteral("a"), QStringLiteral("b")}));
-    QCOMPARE(mCanvas, (QStringList{QStringLiteral("c")}));
-    QCOMPARE(mList->getSelectedArchive(), item(0));
+    QCOMPARE(m_canvas, (QStringList{QStringLiteral("c")}));
+    QCOMPARE(m_list->getSelectedArchive(), item(0));
     // The thumbnails follow by and by.
     QTRY_VERIFY(item(2)->hasChildWidgets());
     QCOMPARE(textLines(item(2)).front(), QStringLiteral("b"));
@@ -162,127 +162,127 @@ void tst_archivelist::gapsAndBlankRows()
     QFile::remove(folder + QStringLiteral("/a.xml"));
     LibraryFixture::writeOrder(folder,
                                {QStringLiteral("c"), QStringLiteral("a"), QString(), QStringLiteral("b")});
-    mList->refreshArchiveList(folder);
+    m_list->refreshArchiveList(folder);
     QCOMPARE(stems(), (QStringList{QStringLiteral("c"), QString(), QStringLiteral("b")}));
     QTRY_VERIFY(item(2)->hasChildWidgets());
     tap(1); // a title without a file
-    QCOMPARE(mList->getSelectedArchive(), item(1));
-    mList->saveArchiveListOrder();
+    QCOMPARE(m_list->getSelectedArchive(), item(1));
+    m_list->saveArchiveListOrder();
     QCOMPARE(LibraryFixture::order(folder),
              (QStringList{QStringLiteral("c"), QString(), QStringLiteral("b")}));
 }
 
 void tst_archivelist::opensAFileInAFolder()
 {
-    QSignalSpy picker(mList.get(), &ArchiveList::startTemplatePicker);
+    QSignalSpy picker(m_list.get(), &ArchiveList::startTemplatePicker);
     const QString folder = threeTitles(QStringLiteral("in file"));
-    mList->refreshArchiveListInFile(folder, QStringLiteral("b.xml"));
-    QCOMPARE(mList->getSelectedArchive(), item(2));
-    QCOMPARE(mCanvas, (QStringList{QStringLiteral("b")}));
+    m_list->refreshArchiveListInFile(folder, QStringLiteral("b.xml"));
+    QCOMPARE(m_list->getSelectedArchive(), item(2));
+    QCOMPARE(m_canvas, (QStringList{QStringLiteral("b")}));
     QCOMPARE(picker.count(), 0);
 }
 
 void tst_archivelist::missingFileSelectsTheFirst()
 {
     const QString folder = threeTitles(QStringLiteral("no file"));
-    mList->refreshArchiveListInFile(folder, QStringLiteral("z.xml"));
-    QCOMPARE(mList->getSelectedArchive(), item(0));
-    QCOMPARE(mCanvas, (QStringList{QStringLiteral("c")}));
+    m_list->refreshArchiveListInFile(folder, QStringLiteral("z.xml"));
+    QCOMPARE(m_list->getSelectedArchive(), item(0));
+    QCOMPARE(m_canvas, (QStringList{QStringLiteral("c")}));
 }
 
 void tst_archivelist::emptyAndMissingFolders()
 {
-    QSignalSpy picker(mList.get(), &ArchiveList::startTemplatePicker);
-    mList->refreshArchiveList(mFixture.makeFolder(QStringLiteral("empty")));
+    QSignalSpy picker(m_list.get(), &ArchiveList::startTemplatePicker);
+    m_list->refreshArchiveList(m_fixture.makeFolder(QStringLiteral("empty")));
     QCOMPARE(picker.count(), 1);
-    mList->refreshArchiveList(QStringLiteral("/nonexistent/folder"));
+    m_list->refreshArchiveList(QStringLiteral("/nonexistent/folder"));
     QCOMPARE(picker.count(), 2);
-    mList->refreshArchiveListInFile(mFixture.makeFolder(QStringLiteral("empty")), QStringLiteral("a.xml"));
+    m_list->refreshArchiveListInFile(m_fixture.makeFolder(QStringLiteral("empty")), QStringLiteral("a.xml"));
     QCOMPARE(picker.count(), 3);
-    QCOMPARE(mCanvas, (QStringList{QStringLiteral("null"), QStringLiteral("null"), QStringLiteral("null")}));
-    QVERIFY(mList->isEmpty());
+    QCOMPARE(m_canvas, (QStringList{QStringLiteral("null"), QStringLiteral("null"), QStringLiteral("null")}));
+    QVERIFY(m_list->isEmpty());
 }
 
 void tst_archivelist::createRequestOffersATemplate()
 {
-    QSignalSpy picker(mList.get(), &ArchiveList::startTemplatePicker);
-    mContext.createNew = true;
+    QSignalSpy picker(m_list.get(), &ArchiveList::startTemplatePicker);
+    m_context.createNew = true;
     const QString folder = threeTitles(QStringLiteral("create"));
-    mList->refreshArchiveList(folder);
+    m_list->refreshArchiveList(folder);
     QCOMPARE(picker.count(), 1);
-    QCOMPARE(mCanvas, (QStringList{QStringLiteral("null")}));
-    QVERIFY(!mList->getSelectedArchive());
-    mList->refreshArchiveListInFile(folder, QStringLiteral("a.xml"));
+    QCOMPARE(m_canvas, (QStringList{QStringLiteral("null")}));
+    QVERIFY(!m_list->getSelectedArchive());
+    m_list->refreshArchiveListInFile(folder, QStringLiteral("a.xml"));
     QCOMPARE(picker.count(), 2);
-    QCOMPARE(mList->getSelectedArchive(), item(1));
+    QCOMPARE(m_list->getSelectedArchive(), item(1));
 }
 
 void tst_archivelist::createRequestForAMissingFileSelectsNothing()
 {
-    QSignalSpy picker(mList.get(), &ArchiveList::startTemplatePicker);
-    mContext.createNew = true;
-    mList->refreshArchiveListInFile(threeTitles(QStringLiteral("create missing")), QStringLiteral("z.xml"));
-    QCOMPARE(mList->count(), 3);
-    QVERIFY(!mList->getSelectedArchive());
-    QVERIFY(mCanvas.isEmpty());
+    QSignalSpy picker(m_list.get(), &ArchiveList::startTemplatePicker);
+    m_context.createNew = true;
+    m_list->refreshArchiveListInFile(threeTitles(QStringLiteral("create missing")), QStringLiteral("z.xml"));
+    QCOMPARE(m_list->count(), 3);
+    QVERIFY(!m_list->getSelectedArchive());
+    QVERIFY(m_canvas.isEmpty());
     QCOMPARE(picker.count(), 1);
-    QVERIFY(mMessages.take().isEmpty());
+    QVERIFY(m_messages.take().isEmpty());
 
-    const QString full = mFixture.makeFolder(QStringLiteral("create missing in full"));
+    const QString full = m_fixture.makeFolder(QStringLiteral("create missing in full"));
     LibraryFixture::fillFolder(full, numbered(99));
-    mList->refreshArchiveListInFile(full, QStringLiteral("z.xml"));
-    QVERIFY(!mList->getSelectedArchive());
-    QVERIFY(mCanvas.isEmpty());
+    m_list->refreshArchiveListInFile(full, QStringLiteral("z.xml"));
+    QVERIFY(!m_list->getSelectedArchive());
+    QVERIFY(m_canvas.isEmpty());
     QCOMPARE(picker.count(), 1);
-    QCOMPARE(mMessages.take(), (Reports{{112, QStringLiteral("99")}}));
+    QCOMPARE(m_messages.take(), (Reports{{112, QStringLiteral("99")}}));
 }
 
 void tst_archivelist::fullFolderRefusesNewTitles()
 {
-    QSignalSpy picker(mList.get(), &ArchiveList::startTemplatePicker);
-    const QString folder = mFixture.makeFolder(QStringLiteral("full"));
+    QSignalSpy picker(m_list.get(), &ArchiveList::startTemplatePicker);
+    const QString folder = m_fixture.makeFolder(QStringLiteral("full"));
     LibraryFixture::fillFolder(folder, numbered(98));
-    mList->refreshArchiveList(folder);
-    QVERIFY(!mList->checkArchiveListIsFull()); // the 99th can be made
+    m_list->refreshArchiveList(folder);
+    QVERIFY(!m_list->checkArchiveListIsFull()); // the 99th can be made
     LibraryFixture::fillFolder(folder, numbered(99));
-    mContext.createNew = true;
-    mList->refreshArchiveList(folder);
-    QVERIFY(mList->checkArchiveListIsFull());
-    QCOMPARE(mMessages.take(), (Reports{{112, QStringLiteral("99")}}));
-    QCOMPARE(mCanvas.back(), QStringLiteral("t00"));
-    mList->refreshArchiveListInFile(folder, QStringLiteral("t05.xml"));
-    QCOMPARE(mMessages.take(), (Reports{{112, QStringLiteral("99")}}));
+    m_context.createNew = true;
+    m_list->refreshArchiveList(folder);
+    QVERIFY(m_list->checkArchiveListIsFull());
+    QCOMPARE(m_messages.take(), (Reports{{112, QStringLiteral("99")}}));
+    QCOMPARE(m_canvas.back(), QStringLiteral("t00"));
+    m_list->refreshArchiveListInFile(folder, QStringLiteral("t05.xml"));
+    QCOMPARE(m_messages.take(), (Reports{{112, QStringLiteral("99")}}));
 
     QTRY_VERIFY(item(0)->hasChildWidgets());
     choose(0, ArchiveAction::ACTION_CREATE);
-    QCOMPARE(mMessages.take(), (Reports{{112, QStringLiteral("99")}}));
+    QCOMPARE(m_messages.take(), (Reports{{112, QStringLiteral("99")}}));
     choose(0, ArchiveAction::ACTION_COPY);
     choose(0, ArchiveAction::ACTION_PASTE);
-    QCOMPARE(mMessages.take(), (Reports{{113, QStringLiteral("99")}}));
+    QCOMPARE(m_messages.take(), (Reports{{113, QStringLiteral("99")}}));
     QCOMPARE(picker.count(), 0);
     // The picker may be open over a full list, which was saved from.
     const auto temp = LibraryFixture::makeRecord(folder, QStringLiteral("t00"), QStringLiteral("text"));
-    mList->createArchiveFromTemplate(temp.get());
-    QCOMPARE(mMessages.take(), (Reports{{112, QStringLiteral("99")}}));
-    QCOMPARE(mList->count(), 99);
+    m_list->createArchiveFromTemplate(temp.get());
+    QCOMPARE(m_messages.take(), (Reports{{112, QStringLiteral("99")}}));
+    QCOMPARE(m_list->count(), 99);
 }
 
 void tst_archivelist::fullDiskRefusesNewTitles()
 {
-    QSignalSpy picker(mList.get(), &ArchiveList::startTemplatePicker);
-    mList->refreshArchiveList(threeTitles(QStringLiteral("disk")));
+    QSignalSpy picker(m_list.get(), &ArchiveList::startTemplatePicker);
+    m_list->refreshArchiveList(threeTitles(QStringLiteral("disk")));
     choose(0, ArchiveAction::ACTION_COPY);
     qputenv("K2SYS_FS_REMAIN", "199999999");
-    QVERIFY(mList->checkDiskSpaceIsFull());
+    QVERIFY(m_list->checkDiskSpaceIsFull());
     choose(0, ArchiveAction::ACTION_CREATE);
-    QCOMPARE(mMessages.take(), (Reports{{114, QStringLiteral("File")}}));
+    QCOMPARE(m_messages.take(), (Reports{{114, QStringLiteral("File")}}));
     choose(0, ArchiveAction::ACTION_PASTE);
-    QCOMPARE(mMessages.take(), (Reports{{116, QString()}}));
+    QCOMPARE(m_messages.take(), (Reports{{116, QString()}}));
     choose(0, ArchiveAction::ACTION_ADD_USER);
-    QCOMPARE(mMessages.take(), (Reports{{197, QStringLiteral("UserTemplate_001")}}));
+    QCOMPARE(m_messages.take(), (Reports{{197, QStringLiteral("UserTemplate_001")}}));
     QCOMPARE(picker.count(), 0);
     qputenv("K2SYS_FS_REMAIN", "200000000");
-    QVERIFY(!mList->checkDiskSpaceIsFull());
+    QVERIFY(!m_list->checkDiskSpaceIsFull());
     choose(0, ArchiveAction::ACTION_CREATE);
     QCOMPARE(picker.count(), 1);
 }
@@ -297,7 +297,7 @@ void tst_archivelist::autoInitTakesTheLastFolder()
     QCOMPARE(list.getCurrentPath(), folder);
     QCOMPARE(label.text(), QStringLiteral("last"));
     QCOMPARE(list.getSelectedArchive(), list.archiveItem(0));
-    QCOMPARE(mFolders.take(), (QStringList{QStringLiteral("start last")}));
+    QCOMPARE(m_folders.take(), (QStringList{QStringLiteral("start last")}));
 }
 
 void tst_archivelist::autoInitFallsBackToTheFirstFolder()
@@ -314,7 +314,7 @@ void tst_archivelist::autoInitFallsBackToTheFirstFolder()
 
 void tst_archivelist::autoInitCanBeInterrupted()
 {
-    const QString many = mFixture.makeFolder(QStringLiteral("interrupted"));
+    const QString many = m_fixture.makeFolder(QStringLiteral("interrupted"));
     LibraryFixture::fillFolder(many, numbered(40));
     const QString folder = threeTitles(QStringLiteral("instead"));
     QLabel label;
@@ -329,13 +329,13 @@ void tst_archivelist::autoInitCanBeInterrupted()
 
 void tst_archivelist::tapSelectsAndTellsTheCanvas()
 {
-    mList->refreshArchiveList(threeTitles(QStringLiteral("tap")));
-    QSignalSpy leaving(mList.get(), &ArchiveList::itemSetDefaultState);
-    mCanvas.clear();
+    m_list->refreshArchiveList(threeTitles(QStringLiteral("tap")));
+    QSignalSpy leaving(m_list.get(), &ArchiveList::itemSetDefaultState);
+    m_canvas.clear();
     tap(2);
-    QCOMPARE(mCanvas, (QStringList{QStringLiteral("b")}));
+    QCOMPARE(m_canvas, (QStringList{QStringLiteral("b")}));
     QCOMPARE(leaving.count(), 1); // the title before gets its pictures
-    QCOMPARE(mStack.count(), 1);
+    QCOMPARE(m_stack.count(), 1);
     QCOMPARE(item(2)->styleSheet(), ArchiveItem::UN_OPERATE_AND_SELECT_STATE);
     QCOMPARE(item(0)->styleSheet(), ArchiveItem::UN_OPERATE_AND_UN_SELECT_STATE);
     QVERIFY(item(2)->isSelected() && !item(0)->isSelected());
@@ -343,72 +343,72 @@ void tst_archivelist::tapSelectsAndTellsTheCanvas()
 
 void tst_archivelist::tapOnTheSelectedItemChangesNothing()
 {
-    mList->refreshArchiveList(threeTitles(QStringLiteral("twice")));
-    mCanvas.clear();
-    mList->selectOperationArchive(0);
+    m_list->refreshArchiveList(threeTitles(QStringLiteral("twice")));
+    m_canvas.clear();
+    m_list->selectOperationArchive(0);
     QCOMPARE(item(0)->styleSheet(), ArchiveItem::OPERATE_AND_SELECT_STATE);
     tap(0);
     QCOMPARE(item(0)->styleSheet(), ArchiveItem::UN_OPERATE_AND_SELECT_STATE); // but the border
-    QVERIFY(mCanvas.isEmpty());
-    QCOMPARE(mStack.count(), 0);
+    QVERIFY(m_canvas.isEmpty());
+    QCOMPARE(m_stack.count(), 0);
 }
 
 void tst_archivelist::dragScrollsAndSelectsNothing()
 {
-    const QString folder = mFixture.makeFolder(QStringLiteral("drag"));
+    const QString folder = m_fixture.makeFolder(QStringLiteral("drag"));
     LibraryFixture::fillFolder(folder, numbered(12));
-    mList->refreshArchiveList(folder);
-    mCanvas.clear();
-    QWidget* port = mList->viewport();
+    m_list->refreshArchiveList(folder);
+    m_canvas.clear();
+    QWidget* port = m_list->viewport();
     QTest::mousePress(port, Qt::LeftButton, Qt::NoModifier, QPoint(100, 700));
     QTest::mouseMove(port, QPoint(100, 600));
     QTest::mouseMove(port, QPoint(100, 500));
     QTest::mouseRelease(port, Qt::LeftButton, Qt::NoModifier, QPoint(100, 500));
-    QCOMPARE(mList->verticalScrollBar()->value(), 200);
-    QVERIFY(mCanvas.isEmpty());
+    QCOMPARE(m_list->verticalScrollBar()->value(), 200);
+    QVERIFY(m_canvas.isEmpty());
 }
 
 void tst_archivelist::longHoldOpensTheMenuAndSelectsNothing()
 {
-    mList->refreshArchiveList(threeTitles(QStringLiteral("hold")));
-    mCanvas.clear();
-    QSignalSpy shown(mList.get(), &ArchiveList::archiveListMenuShow);
+    m_list->refreshArchiveList(threeTitles(QStringLiteral("hold")));
+    m_canvas.clear();
+    QSignalSpy shown(m_list.get(), &ArchiveList::archiveListMenuShow);
     QTest::mousePress(item(1), Qt::LeftButton, Qt::NoModifier, QPoint(20, 20));
     QTRY_COMPARE(shown.count(), 1);
-    QVERIFY(mList->IsOptionMenuShowing());
+    QVERIFY(m_list->IsOptionMenuShowing());
     QCOMPARE(item(1)->styleSheet(), ArchiveItem::OPERATE_AND_UN_SELECT_STATE);
     QTest::mouseRelease(item(1), Qt::LeftButton, Qt::NoModifier, QPoint(20, 20));
-    QVERIFY(mCanvas.isEmpty());
-    mList->slotHideOptionMenu();
-    QVERIFY(!mList->IsOptionMenuShowing());
+    QVERIFY(m_canvas.isEmpty());
+    m_list->slotHideOptionMenu();
+    QVERIFY(!m_list->IsOptionMenuShowing());
     QCOMPARE(item(1)->styleSheet(), ArchiveItem::UN_OPERATE_AND_UN_SELECT_STATE);
     tap(1);
-    QCOMPARE(mCanvas, (QStringList{QStringLiteral("a")}));
+    QCOMPARE(m_canvas, (QStringList{QStringLiteral("a")}));
 
     QTest::mousePress(item(2), Qt::LeftButton, Qt::NoModifier, QPoint(20, 20));
-    mList->stopArchiveListTapAndHoldTimer();
+    m_list->stopArchiveListTapAndHoldTimer();
     QTest::mouseRelease(item(2), Qt::LeftButton, Qt::NoModifier, QPoint(20, 20));
     QCOMPARE(shown.count(), 1);
 }
 
 void tst_archivelist::menuOnEmptyArea()
 {
-    mList->refreshArchiveList(threeTitles(QStringLiteral("area")));
-    QTest::mouseClick(mList->viewport(), Qt::RightButton, Qt::NoModifier, QPoint(200, 900));
+    m_list->refreshArchiveList(threeTitles(QStringLiteral("area")));
+    QTest::mouseClick(m_list->viewport(), Qt::RightButton, Qt::NoModifier, QPoint(200, 900));
     QCOMPARE(enabledActions(), (QStringList{QStringLiteral("Create New")}));
-    mList->slotHideOptionMenu();
+    m_list->slotHideOptionMenu();
     choose(0, ArchiveAction::ACTION_COPY);
-    QTest::mouseClick(mList->viewport(), Qt::RightButton, Qt::NoModifier, QPoint(200, 900));
+    QTest::mouseClick(m_list->viewport(), Qt::RightButton, Qt::NoModifier, QPoint(200, 900));
     QCOMPARE(enabledActions(), (QStringList{QStringLiteral("Create New"), QStringLiteral("Paste")}));
-    mList->slotHideOptionMenu();
-    mList->clearCopyArchive();
-    QTest::mouseClick(mList->viewport(), Qt::RightButton, Qt::NoModifier, QPoint(200, 900));
+    m_list->slotHideOptionMenu();
+    m_list->clearCopyArchive();
+    QTest::mouseClick(m_list->viewport(), Qt::RightButton, Qt::NoModifier, QPoint(200, 900));
     QCOMPARE(enabledActions(), (QStringList{QStringLiteral("Create New")}));
 }
 
 void tst_archivelist::menuOnAnItem()
 {
-    mList->refreshArchiveList(threeTitles(QStringLiteral("on item")));
+    m_list->refreshArchiveList(threeTitles(QStringLiteral("on item")));
     QTest::mouseClick(item(1), Qt::RightButton, Qt::NoModifier, QPoint(20, 20));
     QCOMPARE(enabledActions(), (QStringList{QStringLiteral("Create New"), QStringLiteral("Copy"),
                                             QStringLiteral("Delete"), QStringLiteral("Save as Template")}));
@@ -416,8 +416,8 @@ void tst_archivelist::menuOnAnItem()
     for (QAction* action : menu()->actions())
         types.append(qobject_cast<ArchiveAction*>(action)->getActionType());
     QCOMPARE(types, (QList<int>{0, 1, 2, 3, 5}));
-    QCOMPARE(mList->getCurrentOperationArchive(), item(1));
-    mList->slotHideOptionMenu();
+    QCOMPARE(m_list->getCurrentOperationArchive(), item(1));
+    m_list->slotHideOptionMenu();
     QTest::mouseClick(item(2), Qt::RightButton, Qt::NoModifier, QPoint(20, 20));
     QCOMPARE(item(1)->styleSheet(), ArchiveItem::UN_OPERATE_AND_UN_SELECT_STATE);
     QCOMPARE(item(2)->styleSheet(), ArchiveItem::OPERATE_AND_UN_SELECT_STATE);
@@ -425,53 +425,53 @@ void tst_archivelist::menuOnAnItem()
 
 void tst_archivelist::wheelHidesTheMenu()
 {
-    const QString folder = mFixture.makeFolder(QStringLiteral("wheel"));
+    const QString folder = m_fixture.makeFolder(QStringLiteral("wheel"));
     LibraryFixture::fillFolder(folder, numbered(12));
-    mList->refreshArchiveList(folder);
+    m_list->refreshArchiveList(folder);
     QTest::mouseClick(item(1), Qt::RightButton, Qt::NoModifier, QPoint(20, 20));
-    QVERIFY(mList->IsOptionMenuShowing());
+    QVERIFY(m_list->IsOptionMenuShowing());
     const auto wheel = [this](int delta) {
-        QWheelEvent event(QPointF(100, 100), mList->mapToGlobal(QPointF(100, 100)), QPoint(),
+        QWheelEvent event(QPointF(100, 100), m_list->mapToGlobal(QPointF(100, 100)), QPoint(),
                           QPoint(0, delta), Qt::NoButton, Qt::NoModifier, Qt::NoScrollPhase, false);
         // An open popup keeps wheel events that are sent through the application to itself.
-        mList->wheelEvent(&event);
+        m_list->wheelEvent(&event);
     };
     wheel(-120);
-    QVERIFY(!mList->IsOptionMenuShowing());
-    QCOMPARE(mList->firstVisibleItem(), 1);
+    QVERIFY(!m_list->IsOptionMenuShowing());
+    QCOMPARE(m_list->firstVisibleItem(), 1);
     wheel(120);
-    QCOMPARE(mList->firstVisibleItem(), 0);
+    QCOMPARE(m_list->firstVisibleItem(), 0);
     wheel(120);
-    QCOMPARE(mList->firstVisibleItem(), 0);
+    QCOMPARE(m_list->firstVisibleItem(), 0);
 }
 
 void tst_archivelist::saveRefreshesTheItem()
 {
     const QString folder = threeTitles(QStringLiteral("saved"));
-    mList->refreshArchiveList(folder);
+    m_list->refreshArchiveList(folder);
     QTRY_VERIFY(item(2)->hasChildWidgets());
     const auto changed = LibraryFixture::makeRecord(folder, QStringLiteral("a"), QStringLiteral("速報"));
     QVERIFY(ArchiveController().saveNewArchive(folder, changed.get()));
     QImage picture(240, 135, QImage::Format_ARGB32_Premultiplied);
     picture.fill(Qt::green);
-    mList->refreshBaseItem(folder + QStringLiteral("/a.xml"), picture);
+    m_list->refreshBaseItem(folder + QStringLiteral("/a.xml"), picture);
     QCOMPARE(textLines(item(1)).front(), QStringLiteral("速報"));
     QCOMPARE(item(1)->getArchiveData()->getName(), std::string("a"));
     const QImage shown = item(1)->grab().toImage();
     QCOMPARE(shown.pixelColor(120, 70), QColor(Qt::green));
-    mList->refreshBaseItem(folder + QStringLiteral("/unknown.xml"), picture); // nobody's
-    mList->refreshBaseItem(QString(), QImage());
+    m_list->refreshBaseItem(folder + QStringLiteral("/unknown.xml"), picture); // nobody's
+    m_list->refreshBaseItem(QString(), QImage());
 }
 
 // The pictures of an earlier visit to the folder may become ready while its rows are still being built.
 void tst_archivelist::saveOvertakesTheFirstPicture()
 {
     const QString folder = threeTitles(QStringLiteral("overtaken"));
-    mList->refreshArchiveList(folder);
+    m_list->refreshArchiveList(folder);
     QVERIFY(!item(1)->hasChildWidgets());
     QImage picture(240, 135, QImage::Format_ARGB32_Premultiplied);
     picture.fill(Qt::green);
-    mList->refreshBaseItem(folder + QStringLiteral("/a.xml"), picture);
+    m_list->refreshBaseItem(folder + QStringLiteral("/a.xml"), picture);
     QTRY_VERIFY(item(2)->hasChildWidgets());
     QCOMPARE(item(1)->grab().toImage().pixelColor(120, 70), QColor(Qt::green));
     QVERIFY(item(0)->grab().toImage().pixelColor(120, 70) != QColor(Qt::green));
@@ -622,61 +622,61 @@ void tst_archivelist::cloneOfAnItem()
 void tst_archivelist::followsARenamedFolder()
 {
     const QString before = threeTitles(QStringLiteral("before"));
-    mFixture.makeFolder(QStringLiteral("after"));
-    const QString after = mFixture.titleRoot() + QStringLiteral("/after");
-    mList->refreshArchiveList(before);
-    mList->selectArchive(1);
+    m_fixture.makeFolder(QStringLiteral("after"));
+    const QString after = m_fixture.titleRoot() + QStringLiteral("/after");
+    m_list->refreshArchiveList(before);
+    m_list->selectArchive(1);
     QDir().rmdir(after);
     QVERIFY(QDir().rename(before, after));
-    mCanvas.clear();
-    mFolders.take();
-    mList->refreshArchiveListForChangeFolderName(QStringLiteral("/another"), after);
-    QCOMPARE(mList->getCurrentPath(), before);
-    QVERIFY(mCanvas.isEmpty());
-    QVERIFY(mFolders.take().isEmpty());
-    mList->refreshArchiveListForChangeFolderName(before, after);
-    QCOMPARE(mList->getCurrentPath(), after);
-    QCOMPARE(mList->getSelectedArchive(), item(1));
-    QCOMPARE(mCanvas, (QStringList{QStringLiteral("a")}));
+    m_canvas.clear();
+    m_folders.take();
+    m_list->refreshArchiveListForChangeFolderName(QStringLiteral("/another"), after);
+    QCOMPARE(m_list->getCurrentPath(), before);
+    QVERIFY(m_canvas.isEmpty());
+    QVERIFY(m_folders.take().isEmpty());
+    m_list->refreshArchiveListForChangeFolderName(before, after);
+    QCOMPARE(m_list->getCurrentPath(), after);
+    QCOMPARE(m_list->getSelectedArchive(), item(1));
+    QCOMPARE(m_canvas, (QStringList{QStringLiteral("a")}));
     QCOMPARE(ArchiveController().getLastFolderPath(), after);
-    QCOMPARE(mLabel->text(), QStringLiteral("after"));
-    QCOMPARE(mFolders.take(), (QStringList{QStringLiteral("start after")})); // the old one is no more
+    QCOMPARE(m_label->text(), QStringLiteral("after"));
+    QCOMPARE(m_folders.take(), (QStringList{QStringLiteral("start after")})); // the old one is no more
 }
 
 void tst_archivelist::renamedEmptyFolderOffersATemplate()
 {
-    const QString before = mFixture.makeFolder(QStringLiteral("empty before"));
-    const QString after = mFixture.makeFolder(QStringLiteral("empty after"));
-    mList->refreshArchiveList(before);
+    const QString before = m_fixture.makeFolder(QStringLiteral("empty before"));
+    const QString after = m_fixture.makeFolder(QStringLiteral("empty after"));
+    m_list->refreshArchiveList(before);
     QVERIFY(QDir().rmdir(after));
     QVERIFY(QDir().rename(before, after));
-    mCanvas.clear();
-    QSignalSpy picker(mList.get(), &ArchiveList::startTemplatePicker);
-    mList->refreshArchiveListForChangeFolderName(before, after);
+    m_canvas.clear();
+    QSignalSpy picker(m_list.get(), &ArchiveList::startTemplatePicker);
+    m_list->refreshArchiveListForChangeFolderName(before, after);
     QCOMPARE(picker.count(), 1);
-    QCOMPARE(mList->getCurrentPath(), after);
-    QCOMPARE(mLabel->text(), QStringLiteral("empty after"));
-    QVERIFY(!mList->getSelectedArchive());
-    QVERIFY(mCanvas.isEmpty()); // it is empty already
+    QCOMPARE(m_list->getCurrentPath(), after);
+    QCOMPARE(m_label->text(), QStringLiteral("empty after"));
+    QVERIFY(!m_list->getSelectedArchive());
+    QVERIFY(m_canvas.isEmpty()); // it is empty already
 }
 
 void tst_archivelist::changeOfFolderIsReported()
 {
     const QString first = threeTitles(QStringLiteral("one"));
     const QString second = threeTitles(QStringLiteral("two"));
-    mList->refreshArchiveList(first);
-    mList->refreshArchiveList(second);
-    QCOMPARE(mFolders.take(), (QStringList{QStringLiteral("start one"), QStringLiteral("end one"),
-                                           QStringLiteral("start two")}));
+    m_list->refreshArchiveList(first);
+    m_list->refreshArchiveList(second);
+    QCOMPARE(m_folders.take(), (QStringList{QStringLiteral("start one"), QStringLiteral("end one"),
+                                            QStringLiteral("start two")}));
 }
 
 void tst_archivelist::synchronizationRemovesWhatTheOrderDoesNotName()
 {
-    mList->synchronizationFolderFile(); // no folder: nothing
+    m_list->synchronizationFolderFile(); // no folder: nothing
     const QString folder = threeTitles(QStringLiteral("sync"));
-    mList->refreshArchiveList(folder);
+    m_list->refreshArchiveList(folder);
     LibraryFixture::writeOrder(folder, {QStringLiteral("c"), QStringLiteral("b")});
-    mList->synchronizationFolderFile();
+    m_list->synchronizationFolderFile();
     QVERIFY(!QFile::exists(folder + QStringLiteral("/a.xml")));
     QVERIFY(!QFile::exists(folder + QStringLiteral("/a_240.png")));
     QVERIFY(QFile::exists(folder + QStringLiteral("/b.xml")));
@@ -684,50 +684,50 @@ void tst_archivelist::synchronizationRemovesWhatTheOrderDoesNotName()
 
 void tst_archivelist::cleaningForgetsTheFolder()
 {
-    mList->refreshArchiveList(threeTitles(QStringLiteral("clean")));
-    mList->cleanArchiveList();
-    QVERIFY(mList->isEmpty());
-    QVERIFY(mList->getCurrentPath().isEmpty());
-    QVERIFY(mLabel->text().isEmpty());
-    QVERIFY(!mList->getSelectedArchive());
+    m_list->refreshArchiveList(threeTitles(QStringLiteral("clean")));
+    m_list->cleanArchiveList();
+    QVERIFY(m_list->isEmpty());
+    QVERIFY(m_list->getCurrentPath().isEmpty());
+    QVERIFY(m_label->text().isEmpty());
+    QVERIFY(!m_list->getSelectedArchive());
     QCoreApplication::processEvents(); // items whose thumbnails were still to come
-    QTRY_VERIFY(mList->findChildren<ArchiveItem*>().isEmpty());
+    QTRY_VERIFY(m_list->findChildren<ArchiveItem*>().isEmpty());
 }
 
 void tst_archivelist::selectionIsScrolledIntoView()
 {
-    const QString folder = mFixture.makeFolder(QStringLiteral("scroll"));
+    const QString folder = m_fixture.makeFolder(QStringLiteral("scroll"));
     LibraryFixture::fillFolder(folder, numbered(20));
-    mList->refreshArchiveList(folder);
-    mList->selectArchive(10);
-    QCOMPARE(mList->firstVisibleItem(), 4); // the selection stands in the 7th row
-    mList->selectArchive(1);
-    QCOMPARE(mList->firstVisibleItem(), 1);
-    mList->selectArchive(3);
-    QCOMPARE(mList->firstVisibleItem(), 1);
+    m_list->refreshArchiveList(folder);
+    m_list->selectArchive(10);
+    QCOMPARE(m_list->firstVisibleItem(), 4); // the selection stands in the 7th row
+    m_list->selectArchive(1);
+    QCOMPARE(m_list->firstVisibleItem(), 1);
+    m_list->selectArchive(3);
+    QCOMPARE(m_list->firstVisibleItem(), 1);
 
-    mList->setFixedSize(549, 300);
-    const QString six = mFixture.makeFolder(QStringLiteral("six"));
+    m_list->setFixedSize(549, 300);
+    const QString six = m_fixture.makeFolder(QStringLiteral("six"));
     LibraryFixture::fillFolder(six, numbered(6));
-    mList->refreshArchiveList(six);
-    mList->selectArchive(5);
-    QCOMPARE(mList->firstVisibleItem(), 0);
+    m_list->refreshArchiveList(six);
+    m_list->selectArchive(5);
+    QCOMPARE(m_list->firstVisibleItem(), 0);
 }
 
 void tst_archivelist::moveModeIgnoresTaps()
 {
-    mList->refreshArchiveList(threeTitles(QStringLiteral("move mode")));
-    QVERIFY(!mList->isMoveMode());
-    QSignalSpy drag(mList.get(), &ArchiveList::signalItemsCanDrag);
-    mList->moveButtonClicked(true);
-    QVERIFY(mList->isMoveMode());
-    mCanvas.clear();
+    m_list->refreshArchiveList(threeTitles(QStringLiteral("move mode")));
+    QVERIFY(!m_list->isMoveMode());
+    QSignalSpy drag(m_list.get(), &ArchiveList::signalItemsCanDrag);
+    m_list->moveButtonClicked(true);
+    QVERIFY(m_list->isMoveMode());
+    m_canvas.clear();
     tap(1);
     QTest::mouseClick(item(1), Qt::RightButton, Qt::NoModifier, QPoint(20, 20));
-    QVERIFY(mCanvas.isEmpty());
-    QVERIFY(!mList->IsOptionMenuShowing());
-    mList->moveButtonClicked(false);
-    QVERIFY(!mList->isMoveMode());
+    QVERIFY(m_canvas.isEmpty());
+    QVERIFY(!m_list->IsOptionMenuShowing());
+    m_list->moveButtonClicked(false);
+    QVERIFY(!m_list->isMoveMode());
     QCOMPARE(drag.count(), 2);
 }
 
@@ -747,21 +747,21 @@ void tst_archivelist::leftoversOfAKilledSaveAreSwept()
 
 void tst_archivelist::language()
 {
-    mList->refreshArchiveList(threeTitles(QStringLiteral("language")));
+    m_list->refreshArchiveList(threeTitles(QStringLiteral("language")));
     QTRY_VERIFY(item(2)->hasChildWidgets());
     QTest::mouseClick(item(1), Qt::RightButton, Qt::NoModifier, QPoint(20, 20));
     QCOMPARE(menu()->font().family(), QStringLiteral("KST"));
     QCOMPARE(menu()->font().pixelSize(), 28);
-    mList->slotHideOptionMenu();
-    mList->translateText();
-    mList->setSystemLanFont(QStringLiteral("DFHeiW5-A"));
+    m_list->slotHideOptionMenu();
+    m_list->translateText();
+    m_list->setSystemLanFont(QStringLiteral("DFHeiW5-A"));
     const QFont font = item(0)->getRightChild()->findChild<QLabel*>()->font();
     QCOMPARE(font.family(), QStringLiteral("DFHeiW5-A"));
     QCOMPARE(font.pixelSize(), 28);
     QTest::mouseClick(item(1), Qt::RightButton, Qt::NoModifier, QPoint(20, 20));
     QCOMPARE(menu()->font().family(), QStringLiteral("DFHeiW5-A"));
     QCOMPARE(menu()->font().pixelSize(), 28);
-    mList->setSystemLanFont(QStringLiteral("KST"));
+    m_list->setSystemLanFont(QStringLiteral("KST"));
 }
 
 QTEST_MAIN(tst_archivelist)

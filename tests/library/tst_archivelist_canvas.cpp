@@ -46,71 +46,71 @@ private:
     }
     QString canvasTitle() const
     {
-        return mScene->archive()
-                   ? QFileInfo(QString::fromStdString(mScene->archive()->getPath())).completeBaseName()
+        return m_scene->archive()
+                   ? QFileInfo(QString::fromStdString(m_scene->archive()->getPath())).completeBaseName()
                    : QString();
     }
     // As the window does on a template's choice.
     void createTitle(const QString& text)
     {
-        const auto temp = LibraryFixture::makeRecord(mFixture.makeFolder(QStringLiteral("presets")),
+        const auto temp = LibraryFixture::makeRecord(m_fixture.makeFolder(QStringLiteral("presets")),
                                                      QStringLiteral("p"), text);
-        mList->createArchiveFromTemplate(temp.get());
-        mScene->createThumnailPicture();
+        m_list->createArchiveFromTemplate(temp.get());
+        m_scene->createThumnailPicture();
     }
 
-    LibraryFixture mFixture;
-    std::unique_ptr<QUndoStack> mStack;
-    std::unique_ptr<QLabel> mLabel;
-    std::unique_ptr<CanvasScene> mScene;
-    std::unique_ptr<ArchiveList> mList;
+    LibraryFixture m_fixture;
+    std::unique_ptr<QUndoStack> m_stack;
+    std::unique_ptr<QLabel> m_label;
+    std::unique_ptr<CanvasScene> m_scene;
+    std::unique_ptr<ArchiveList> m_list;
 };
 
 void tst_archivelist_canvas::init()
 {
-    mStack = std::make_unique<QUndoStack>();
-    mLabel = std::make_unique<QLabel>();
-    mScene = std::make_unique<CanvasScene>(std::make_unique<ThumbnailRender>());
-    mScene->setSceneRect(0, 0, 1280, 720);
-    mList = std::make_unique<ArchiveList>(mLabel.get(), false);
-    mList->setFixedSize(549, 997);
-    mList->setMainScene(mScene.get());
+    m_stack = std::make_unique<QUndoStack>();
+    m_label = std::make_unique<QLabel>();
+    m_scene = std::make_unique<CanvasScene>(std::make_unique<ThumbnailRender>());
+    m_scene->setSceneRect(0, 0, 1280, 720);
+    m_list = std::make_unique<ArchiveList>(m_label.get(), false);
+    m_list->setFixedSize(549, 997);
+    m_list->setMainScene(m_scene.get());
     for (auto signal : {&ArchiveList::deleteCommandSignal, &ArchiveList::pasteCommandSignal,
                         &ArchiveList::focusCommandSignal})
-        connect(mList.get(), signal, mStack.get(), &QUndoStack::push);
-    connect(mList.get(), &ArchiveList::signalUpdateCanvas, mScene.get(), &CanvasScene::slotUpdateArchive);
-    connect(mList.get(), &ArchiveList::itemSetDefaultState, mScene.get(),
+        connect(m_list.get(), signal, m_stack.get(), &QUndoStack::push);
+    connect(m_list.get(), &ArchiveList::signalUpdateCanvas, m_scene.get(), &CanvasScene::slotUpdateArchive);
+    connect(m_list.get(), &ArchiveList::itemSetDefaultState, m_scene.get(),
             &CanvasScene::slotMakeSceneThumnail);
-    connect(mScene.get(), &CanvasScene::signalSaveOk, mList.get(), &ArchiveList::refreshBaseItem);
-    mList->show();
+    connect(m_scene.get(), &CanvasScene::signalSaveOk, m_list.get(), &ArchiveList::refreshBaseItem);
+    m_list->show();
 }
 
 void tst_archivelist_canvas::cleanup()
 {
-    mStack.reset();
-    mList.reset();
-    mScene.reset();
+    m_stack.reset();
+    m_list.reset();
+    m_scene.reset();
 }
 
 void tst_archivelist_canvas::selectedTitleIsOnTheCanvas()
 {
-    const QString folder = mFixture.makeFolder(QStringLiteral("select"));
+    const QString folder = m_fixture.makeFolder(QStringLiteral("select"));
     LibraryFixture::fillFolder(folder, {QStringLiteral("a"), QStringLiteral("b")});
-    mList->refreshArchiveListInFile(folder, QStringLiteral("b.xml"));
+    m_list->refreshArchiveListInFile(folder, QStringLiteral("b.xml"));
     QCOMPARE(canvasTitle(), QStringLiteral("b"));
-    QTest::mouseClick(mList->archiveItem(0), Qt::LeftButton, Qt::NoModifier, QPoint(20, 20));
+    QTest::mouseClick(m_list->archiveItem(0), Qt::LeftButton, Qt::NoModifier, QPoint(20, 20));
     QCOMPARE(canvasTitle(), QStringLiteral("a"));
-    mStack->undo();
+    m_stack->undo();
     QCOMPARE(canvasTitle(), QStringLiteral("b"));
-    QVERIFY(mScene->isEditFinish()); // nothing was changed, so no picture is made
+    QVERIFY(m_scene->isEditFinish()); // nothing was changed, so no picture is made
 }
 
 void tst_archivelist_canvas::newTitleShowsItsPictureAtOnce()
 {
-    mList->refreshArchiveList(mFixture.makeFolder(QStringLiteral("new")));
+    m_list->refreshArchiveList(m_fixture.makeFolder(QStringLiteral("new")));
     createTitle(QStringLiteral("速報 New"));
-    QCOMPARE(mList->count(), 1);
-    const ArchiveItem* item = mList->archiveItem(0);
+    QCOMPARE(m_list->count(), 1);
+    const ArchiveItem* item = m_list->archiveItem(0);
     QCOMPARE(textLines(item).front(), QStringLiteral("速報 New"));
     QCOMPARE(canvasTitle(), QString::fromStdString(item->getArchiveData()->getName()));
     QVERIFY(!QFile::exists(item->getArchiveData()->getFullPathOfThumbnailSmall()));
@@ -118,44 +118,44 @@ void tst_archivelist_canvas::newTitleShowsItsPictureAtOnce()
 
 void tst_archivelist_canvas::leavingANewTitleWritesItsPictures()
 {
-    const QString folder = mFixture.makeFolder(QStringLiteral("leave"));
+    const QString folder = m_fixture.makeFolder(QStringLiteral("leave"));
     LibraryFixture::fillFolder(folder, {QStringLiteral("a")});
-    mList->refreshArchiveList(folder);
+    m_list->refreshArchiveList(folder);
     createTitle(QStringLiteral("Left"));
     const QString stem = canvasTitle();
     QVERIFY(stem != QStringLiteral("a"));
-    mList->selectArchive(mList->count() - 1 - mList->getItemIndex(mList->getSelectedArchive()));
+    m_list->selectArchive(m_list->count() - 1 - m_list->getItemIndex(m_list->getSelectedArchive()));
     QCOMPARE(canvasTitle(), QStringLiteral("a"));
-    QTRY_VERIFY(mScene->isEditFinish());
+    QTRY_VERIFY(m_scene->isEditFinish());
     for (const char* suffix : {"_1920.png", "_960.png", "_240.png", "_240S.png"})
         QVERIFY(!QImage(folder + QLatin1Char('/') + stem + QLatin1String(suffix)).isNull());
 }
 
 void tst_archivelist_canvas::leavingATextThatIsTypedWritesItsPictures()
 {
-    const QString folder = mFixture.makeFolder(QStringLiteral("typed"));
+    const QString folder = m_fixture.makeFolder(QStringLiteral("typed"));
     LibraryFixture::fillFolder(folder, {QStringLiteral("a"), QStringLiteral("b")});
-    mList->refreshArchiveList(folder);
-    connect(mScene.get(), &CanvasScene::signalPushUndoCommandIntoStack, mStack.get(), &QUndoStack::push);
-    GraphicsText* text = mScene->findTextItem(1);
+    m_list->refreshArchiveList(folder);
+    connect(m_scene.get(), &CanvasScene::signalPushUndoCommandIntoStack, m_stack.get(), &QUndoStack::push);
+    GraphicsText* text = m_scene->findTextItem(1);
     text->setTextInteractionFlags(Qt::TextEditorInteraction);
     text->textCursor().insertText(QStringLiteral("longer than before "));
-    QTest::mouseClick(mList->archiveItem(1), Qt::LeftButton, Qt::NoModifier, QPoint(20, 20));
+    QTest::mouseClick(m_list->archiveItem(1), Qt::LeftButton, Qt::NoModifier, QPoint(20, 20));
     QCOMPARE(canvasTitle(), QStringLiteral("b"));
-    QVERIFY(!mScene->isEditFinish());
-    QTRY_VERIFY(mScene->isEditFinish());
+    QVERIFY(!m_scene->isEditFinish());
+    QTRY_VERIFY(m_scene->isEditFinish());
     const QRect ink = inkIn(QImage(folder + QStringLiteral("/a_1920.png")));
     QVERIFY(ink.width() > 200);
     // The other was only looked at.
-    mList->selectArchive(0);
-    QVERIFY(mScene->isEditFinish());
+    m_list->selectArchive(0);
+    QVERIFY(m_scene->isEditFinish());
     QCOMPARE(QImage(folder + QStringLiteral("/b_1920.png")).size(), QSize(240, 135)); // as it was
 }
 
 // It is decoded while the copy is held, so a file that changes in between must be noticed.
 void tst_archivelist_canvas::pastedTitleHasTheBackgroundOfItsFile()
 {
-    const QString folder = mFixture.makeFolder(QStringLiteral("paste"));
+    const QString folder = m_fixture.makeFolder(QStringLiteral("paste"));
     LibraryFixture::fillFolder(folder, {QStringLiteral("a"), QStringLiteral("b")});
     const auto archive = LibraryFixture::makeRecord(folder, QStringLiteral("a"), QStringLiteral("A"));
     archive->setBgResource("a_source_1280.png");
@@ -170,57 +170,57 @@ void tst_archivelist_canvas::pastedTitleHasTheBackgroundOfItsFile()
     const auto colourOnCanvas = [this] {
         QImage canvas(1280, 720, QImage::Format_RGB32);
         QPainter painter(&canvas);
-        mScene->render(&painter, QRectF(), QRectF(0, 0, 1280, 720));
+        m_scene->render(&painter, QRectF(), QRectF(0, 0, 1280, 720));
         painter.end();
         return canvas.pixelColor(1270, 710);
     };
     ArchiveAction copy(QString(), ArchiveAction::ACTION_COPY, nullptr);
     ArchiveAction pasteIt(QString(), ArchiveAction::ACTION_PASTE, nullptr);
     QVERIFY(paint(Qt::darkRed));
-    mList->refreshArchiveListInFile(folder, QStringLiteral("b.xml"));
+    m_list->refreshArchiveListInFile(folder, QStringLiteral("b.xml"));
 
-    mList->selectOperationArchive(0);
-    mList->selectOptionMenuItem(&copy);
-    mList->selectOptionMenuItem(&pasteIt);
-    QCOMPARE(mList->count(), 3);
+    m_list->selectOperationArchive(0);
+    m_list->selectOptionMenuItem(&copy);
+    m_list->selectOptionMenuItem(&pasteIt);
+    QCOMPARE(m_list->count(), 3);
     QVERIFY(canvasTitle() != QStringLiteral("a") && canvasTitle() != QStringLiteral("b"));
     QCOMPARE(colourOnCanvas(), QColor(Qt::darkRed));
 
     QVERIFY(paint(Qt::darkBlue));
-    mList->selectOptionMenuItem(&pasteIt);
-    QCOMPARE(mList->count(), 4);
+    m_list->selectOptionMenuItem(&pasteIt);
+    QCOMPARE(m_list->count(), 4);
     QCOMPARE(colourOnCanvas(), QColor(Qt::darkBlue));
 }
 
 void tst_archivelist_canvas::deletedTitleLeavesTheCanvas()
 {
-    const QString folder = mFixture.makeFolder(QStringLiteral("delete"));
-    mList->refreshArchiveList(folder);
+    const QString folder = m_fixture.makeFolder(QStringLiteral("delete"));
+    m_list->refreshArchiveList(folder);
     createTitle(QStringLiteral("Gone"));
-    mStack->undo();
-    QVERIFY(mList->isEmpty());
-    QVERIFY(mScene->getTextItemList().isEmpty());
-    mList->synchronizationFolderFile();
+    m_stack->undo();
+    QVERIFY(m_list->isEmpty());
+    QVERIFY(m_scene->getTextItemList().isEmpty());
+    m_list->synchronizationFolderFile();
     QVERIFY(QDir(folder).entryList({QStringLiteral("*.xml")}, QDir::Files).isEmpty());
-    mStack->redo();
-    QCOMPARE(mScene->getTextItemList().size(), 1);
+    m_stack->redo();
+    QCOMPARE(m_scene->getTextItemList().size(), 1);
 }
 
 void tst_archivelist_canvas::deletedTitleLeavesNoPictures()
 {
     FakeTitleChangeReporter reporter(FakeTitleChangeReporter::Pictures::Hold);
-    const QString folder = mFixture.makeFolder(QStringLiteral("trace"));
-    mList->refreshArchiveList(folder);
+    const QString folder = m_fixture.makeFolder(QStringLiteral("trace"));
+    m_list->refreshArchiveList(folder);
     createTitle(QStringLiteral("Kept"));
     const QString kept = canvasTitle();
     createTitle(QStringLiteral("Gone"));
     QTRY_COMPARE(reporter.reached.available(), 1); // the thread is busy with the first one
     const QString gone = canvasTitle();
     QVERIFY(gone != kept);
-    mStack->undo();
-    mList->synchronizationFolderFile();
+    m_stack->undo();
+    m_list->synchronizationFolderFile();
     reporter.goOn.release(1000);
-    QTRY_VERIFY(mScene->isEditFinish());
+    QTRY_VERIFY(m_scene->isEditFinish());
     QCOMPARE(QDir(folder).entryList({gone + QLatin1Char('*')}, QDir::Files), QStringList());
     for (const char* suffix : {".xml", "_1920.png", "_960.png", "_240.png", "_240S.png"})
         QVERIFY(QFile::exists(folder + QLatin1Char('/') + kept + QLatin1String(suffix)));
@@ -229,25 +229,25 @@ void tst_archivelist_canvas::deletedTitleLeavesNoPictures()
 // Another process gives the open folder a new name while pictures are on their way; its notice comes later.
 void tst_archivelist_canvas::picturesFollowTheirFolder()
 {
-    const QString before = mFixture.makeFolder(QStringLiteral("before"));
+    const QString before = m_fixture.makeFolder(QStringLiteral("before"));
     const QString after = before + QStringLiteral(" and after");
     QDir(after).removeRecursively();
     {
         FakeTitleChangeReporter reporter(FakeTitleChangeReporter::Pictures::Hold);
-        mList->refreshArchiveList(before);
+        m_list->refreshArchiveList(before);
         createTitle(QStringLiteral("One"));
-        mScene->slotMakeSceneThumnail();
+        m_scene->slotMakeSceneThumnail();
         // The thread is busy with it.
         QTRY_COMPARE(reporter.reached.available(), 1);
         createTitle(QStringLiteral("Two"));
         createTitle(QStringLiteral("Three"));
-        mScene->slotMakeSceneThumnail();
+        m_scene->slotMakeSceneThumnail();
         QVERIFY(QDir().rename(before, after));
         reporter.goOn.release(1000);
-        QTRY_VERIFY(mScene->isEditFinish()); // those that went into the void
+        QTRY_VERIFY(m_scene->isEditFinish()); // those that went into the void
         createTitle(QStringLiteral("lost with the folder"));
-        mList->refreshArchiveListForChangeFolderName(before, after);
-        QTRY_VERIFY(mScene->isEditFinish());
+        m_list->refreshArchiveListForChangeFolderName(before, after);
+        QTRY_VERIFY(m_scene->isEditFinish());
     }
     QVERIFY(!QFileInfo::exists(before));
     const QStringList titles = QDir(after).entryList({QStringLiteral("*.xml")}, QDir::Files);
@@ -262,7 +262,7 @@ void tst_archivelist_canvas::picturesFollowTheirFolder()
 
 void tst_archivelist_canvas::picturesShowWhatTheCanvasShows()
 {
-    const QString folder = mFixture.makeFolder(QStringLiteral("same"));
+    const QString folder = m_fixture.makeFolder(QStringLiteral("same"));
     const auto archive = LibraryFixture::makeRecord(folder, QStringLiteral("t"), QString());
     std::vector<TText*> texts;
     for (const int align : {-1, 0, 1}) {
@@ -276,17 +276,17 @@ void tst_archivelist_canvas::picturesShowWhatTheCanvasShows()
     }
     archive->setText(texts);
     QVERIFY(ArchiveController().saveNewArchive(folder, archive.get()));
-    mScene->slotUpdateArchive(archive.get());
+    m_scene->slotUpdateArchive(archive.get());
     QImage canvas(1280, 720, QImage::Format_ARGB32_Premultiplied);
     canvas.fill(Qt::transparent);
     QPainter painter(&canvas);
     painter.setRenderHint(QPainter::Antialiasing);
-    mScene->render(&painter, QRectF(), QRectF(0, 0, 1280, 720));
+    m_scene->render(&painter, QRectF(), QRectF(0, 0, 1280, 720));
     painter.end();
 
-    mScene->saveArchiveFlag();
-    mScene->slotMakeSceneThumnail();
-    QTRY_VERIFY(mScene->isEditFinish());
+    m_scene->saveArchiveFlag();
+    m_scene->slotMakeSceneThumnail();
+    QTRY_VERIFY(m_scene->isEditFinish());
     const QRect onCanvas = inkIn(canvas);
     const QRect onAir = inkIn(QImage(folder + QStringLiteral("/t_1920.png")));
     QVERIFY(!onCanvas.isEmpty());

@@ -41,25 +41,25 @@ void cutInHalf(const QString& path)
 class Unreadable
 {
 public:
-    explicit Unreadable(const QString& folder) : mFolder(folder)
+    explicit Unreadable(const QString& folder) : m_folder(folder)
     {
-        QFile::setPermissions(mFolder, QFileDevice::Permissions());
-        mIsRoot = ::geteuid() == 0;
-        if (mIsRoot && ::seteuid(NOBODY) != 0)
+        QFile::setPermissions(m_folder, QFileDevice::Permissions());
+        m_isRoot = ::geteuid() == 0;
+        if (m_isRoot && ::seteuid(NOBODY) != 0)
             qFatal("cannot leave the superuser");
     }
     ~Unreadable()
     {
-        if (mIsRoot && ::seteuid(0) != 0)
+        if (m_isRoot && ::seteuid(0) != 0)
             qFatal("cannot come back");
-        QFile::setPermissions(mFolder, QFile::ReadOwner | QFile::WriteOwner | QFile::ExeOwner);
+        QFile::setPermissions(m_folder, QFile::ReadOwner | QFile::WriteOwner | QFile::ExeOwner);
     }
     Q_DISABLE_COPY_MOVE(Unreadable)
 
 private:
     static constexpr uid_t NOBODY = 65534;
-    QString mFolder;
-    bool mIsRoot = false;
+    QString m_folder;
+    bool m_isRoot = false;
 };
 
 } // namespace
@@ -91,23 +91,23 @@ private Q_SLOTS:
 private:
     QString abc(const QString& name)
     {
-        const QString folder = mFixture.makeFolder(name);
+        const QString folder = m_fixture.makeFolder(name);
         LibraryFixture::fillFolder(folder, {"a", "b", "c"});
         return folder;
     }
 
-    LibraryFixture mFixture;
-    FakeEditContext mContext;
-    FakeTitlerFolderReporter mFolders;
-    FakeTitleChangeReporter mReports;
-    FakeMessageBoxController mMessages;
-    TouchDevice mDevice;
+    LibraryFixture m_fixture;
+    FakeEditContext m_context;
+    FakeTitlerFolderReporter m_folders;
+    FakeTitleChangeReporter m_reports;
+    FakeMessageBoxController m_messages;
+    TouchDevice m_device;
     std::unique_ptr<TitleListFixture> m;
 };
 
 void tst_archivelist_folders::init()
 {
-    m = std::make_unique<TitleListFixture>(mDevice);
+    m = std::make_unique<TitleListFixture>(m_device);
 }
 
 void tst_archivelist_folders::cleanup()
@@ -193,7 +193,7 @@ void tst_archivelist_folders::folderWithoutAnOrderGetsOneAtTheStart()
     const QString folder = abc(QStringLiteral("orderless"));
     QVERIFY(QFile::remove(folder + "/.order.xml"));
     m = nullptr;
-    m = std::make_unique<TitleListFixture>(mDevice);
+    m = std::make_unique<TitleListFixture>(m_device);
     m->open(folder);
     Names stems = m->stems();
     stems.sort();
@@ -298,14 +298,14 @@ void tst_archivelist_folders::unreadableFolder()
         m->list->refreshArchiveList(folder);
         QCOMPARE(m->stems(), Names());
         QCOMPARE(picker.size(), 1);
-        mMessages.take();
+        m_messages.take();
         m->hold(TitleListFixture::PICTURE_X, 400);
         m->choose(ArchiveAction::ACTION_CREATE); // there is no room for a title that can be seen
-        QCOMPARE(mMessages.take(), (Reports{{114, QStringLiteral("File")}}));
+        QCOMPARE(m_messages.take(), (Reports{{114, QStringLiteral("File")}}));
         QCOMPARE(picker.size(), 1);
         Archive blank;
         m->list->createArchiveFromTemplate(&blank); // refused, which is told, too
-        QCOMPARE(mMessages.take(), (Reports{{114, QStringLiteral("File")}}));
+        QCOMPARE(m_messages.take(), (Reports{{114, QStringLiteral("File")}}));
         QCOMPARE(m->list->count(), 0);
         m->list->synchronizationFolderFile();
     }
@@ -321,9 +321,9 @@ void tst_archivelist_folders::unwritableFolderMakesNoTitle()
     QSignalSpy pasted(m->list, &ArchiveList::signalStartPasteArchive);
     {
         const Unreadable rights(folder);
-        mMessages.take();
+        m_messages.take();
         m->holdAndChoose(1, ArchiveAction::ACTION_PASTE);
-        QCOMPARE(mMessages.take(), (Reports{{116, QString()}}));
+        QCOMPARE(m_messages.take(), (Reports{{116, QString()}}));
     }
     QCOMPARE(m->stems(), (Names{"a", "b", "c"}));
     QCOMPARE(m->stack.count(), 0);
@@ -335,17 +335,17 @@ void tst_archivelist_folders::unwritableFolderMakesNoTitle()
 
 void tst_archivelist_folders::readOnlyTemplateFolderTakesNoTemplate()
 {
-    const QString templates = QDir::cleanPath(mFixture.titleRoot() + "/../usertemplates");
+    const QString templates = QDir::cleanPath(m_fixture.titleRoot() + "/../usertemplates");
     QDir(templates).removeRecursively();
     QVERIFY(QDir().mkpath(templates));
     const QString folder = abc(QStringLiteral("as template"));
     m->open(folder);
     QSignalSpy added(m->list, &ArchiveList::addUserSignal);
     QSignalSpy picker(m->list, &ArchiveList::startUserTemplatePicker);
-    mMessages.take();
-    mReports.take();
+    m_messages.take();
+    m_reports.take();
     // Others, and the group that is kept, may reach the title, not the templates.
-    const QString root = QDir::cleanPath(mFixture.titleRoot() + "/../..");
+    const QString root = QDir::cleanPath(m_fixture.titleRoot() + "/../..");
     QVERIFY(QFile::setPermissions(root, QFile::permissions(root) | QFile::ReadGroup | QFile::ExeGroup |
                                             QFile::ReadOther | QFile::ExeOther));
     {
@@ -353,9 +353,9 @@ void tst_archivelist_folders::readOnlyTemplateFolderTakesNoTemplate()
         m->holdAndChoose(1, ArchiveAction::ACTION_ADD_USER);
     }
     QCOMPARE(added.size(), 0);
-    QCOMPARE(mMessages.take(), (Reports{{197, QStringLiteral("UserTemplate_001")}}));
+    QCOMPARE(m_messages.take(), (Reports{{197, QStringLiteral("UserTemplate_001")}}));
     QCOMPARE(picker.size(), 0);
-    QCOMPARE(mReports.take(), Reports());
+    QCOMPARE(m_reports.take(), Reports());
     QCOMPARE(m->stems(), (Names{"a", "b", "c"}));
     QCOMPARE(QDir(templates).entryList(QDir::AllEntries | QDir::NoDotAndDotDot), Names());
     m->holdAndChoose(1, ArchiveAction::ACTION_ADD_USER); // and now it can
@@ -455,7 +455,7 @@ void tst_archivelist_folders::titleGoneWhileOpen()
 
 void tst_archivelist_folders::titlesOfOneMoment()
 {
-    const QString folder = mFixture.makeFolder(QStringLiteral("moment"));
+    const QString folder = m_fixture.makeFolder(QStringLiteral("moment"));
     // Of the same second, and one that only looks like it.
     const Names names{"20260101120000000", "20260101120000001", "20260101120000"};
     LibraryFixture::fillFolder(folder, names);

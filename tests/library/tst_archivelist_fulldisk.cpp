@@ -50,7 +50,7 @@ private Q_SLOTS:
 private:
     QString abc(const QString& name)
     {
-        const QString folder = mFixture.makeFolder(name);
+        const QString folder = m_fixture.makeFolder(name);
         LibraryFixture::fillFolder(folder, {"a", "b", "c"});
         return folder;
     }
@@ -58,7 +58,7 @@ private:
     {
         Reports posted;
         const auto isPosted = [&] {
-            posted += mMessages.take();
+            posted += m_messages.take();
             return !posted.isEmpty();
         };
         if (!QTest::qWaitFor(isPosted, PATIENCE_MS))
@@ -75,22 +75,22 @@ private:
         }
     }
 
-    LibraryFixture mFixture;
-    FakeMessageBoxController mMessages;
-    TouchDevice mDevice;
+    LibraryFixture m_fixture;
+    FakeMessageBoxController m_messages;
+    TouchDevice m_device;
     std::unique_ptr<TitleListFixture> m;
 };
 
 void tst_archivelist_fulldisk::init()
 {
-    m = std::make_unique<TitleListFixture>(mDevice);
-    mMessages.take();
+    m = std::make_unique<TitleListFixture>(m_device);
+    m_messages.take();
 }
 
 void tst_archivelist_fulldisk::cleanup()
 {
     m.reset();
-    RefusedWrites::forgetFolder(mFixture.titleRoot().toStdString());
+    RefusedWrites::forgetFolder(m_fixture.titleRoot().toStdString());
 }
 
 // The delete and the Close find a full disk; with room again the folder is opened once more in this process,
@@ -109,7 +109,7 @@ void tst_archivelist_fulldisk::deleteThatDoesNotFitCostsNoTitle()
     }
     verifyTitles(folder, {"a", "b", "c"});
     m->list->refreshArchiveList(folder);
-    const auto temp = LibraryFixture::makeRecord(mFixture.makeFolder(QStringLiteral("presets")),
+    const auto temp = LibraryFixture::makeRecord(m_fixture.makeFolder(QStringLiteral("presets")),
                                                  QStringLiteral("p"), QStringLiteral("New"));
     m->list->createArchiveFromTemplate(temp.get());
     m->list->synchronizationFolderFile();
@@ -135,7 +135,7 @@ void tst_archivelist_fulldisk::orderIsToldOnceAndWrittenWhenThereIsRoom()
     // Nobody does anything.
     QTRY_VERIFY(!read(folder + "/.order.xml").contains("\"c.xml\""));
     QCOMPARE(LibraryFixture::order(folder), (Names{"a", "b"}));
-    QCOMPARE(mMessages.take(), Reports());
+    QCOMPARE(m_messages.take(), Reports());
     // It could not be written for a while: what it does not name stays for now.
     m->list->synchronizationFolderFile();
     verifyTitles(folder, {"a", "b", "c"});
@@ -169,7 +169,7 @@ void tst_archivelist_fulldisk::titlesOfADamagedOrderAreListedByName()
 {
     QFETCH(bool, exists);
     QFETCH(QByteArray, order);
-    const QString folder = mFixture.makeFolder(QStringLiteral("by name"));
+    const QString folder = m_fixture.makeFolder(QStringLiteral("by name"));
     LibraryFixture::fillFolder(folder, {"c", "d", "a", "b"});
     write(folder + "/d.xml", "torn");
     if (exists)
@@ -262,16 +262,16 @@ void tst_archivelist_fulldisk::refusedTitlesLeaveNothingAndAreTold()
     m->open(folder);
     m->holdAndChoose(1, ArchiveAction::ACTION_COPY);
     const Names before = settledEntries(folder);
-    const QString templates = QDir::cleanPath(mFixture.titleRoot() + "/../usertemplates");
+    const QString templates = QDir::cleanPath(m_fixture.titleRoot() + "/../usertemplates");
     const FullDisk disk;
-    mMessages.take();
+    m_messages.take();
     m->holdAndChoose(0, ArchiveAction::ACTION_PASTE);
-    QCOMPARE(mMessages.take(), (Reports{{116, QString()}}));
+    QCOMPARE(m_messages.take(), (Reports{{116, QString()}}));
     const auto temp = LibraryFixture::makeRecord(folder, QStringLiteral("a"), QStringLiteral("New"));
     m->list->createArchiveFromTemplate(temp.get());
-    QCOMPARE(mMessages.take(), (Reports{{114, QStringLiteral("File")}}));
+    QCOMPARE(m_messages.take(), (Reports{{114, QStringLiteral("File")}}));
     m->holdAndChoose(0, ArchiveAction::ACTION_ADD_USER);
-    QCOMPARE(mMessages.take(), (Reports{{197, QStringLiteral("UserTemplate_001")}}));
+    QCOMPARE(m_messages.take(), (Reports{{197, QStringLiteral("UserTemplate_001")}}));
     QCOMPARE(m->stems(), (Names{"a", "b", "c"}));
     QCOMPARE(settledEntries(folder), before);
     QVERIFY(!QFileInfo::exists(templates + "/UserTemplate_001"));

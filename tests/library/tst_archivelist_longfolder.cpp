@@ -68,33 +68,33 @@ private:
     }
     QString makeFolder()
     {
-        const QString folder = mFixture.titleRoot() + QStringLiteral("/long%1").arg(++mFolderNumber);
-        if (mPattern.isEmpty())
+        const QString folder = m_fixture.titleRoot() + QStringLiteral("/long%1").arg(++m_folderNumber);
+        if (m_pattern.isEmpty())
             makePattern();
         QDir().mkpath(folder);
         // Links are quick to make, and all who write replace the file.
-        for (const QString& name : QDir(mPattern).entryList(QDir::Files))
-            ::link(qPrintable(mPattern + '/' + name), qPrintable(folder + '/' + name));
-        QFile::copy(mPattern + "/.order.xml", folder + "/.order.xml");
+        for (const QString& name : QDir(m_pattern).entryList(QDir::Files))
+            ::link(qPrintable(m_pattern + '/' + name), qPrintable(folder + '/' + name));
+        QFile::copy(m_pattern + "/.order.xml", folder + "/.order.xml");
         return folder;
     }
     // All titles are the first one with another name.
     void makePattern()
     {
-        mPattern = mFixture.makeFolder(QStringLiteral("pattern"));
-        LibraryFixture::fillFolder(mPattern, {stem(0)});
-        QFile first(mPattern + '/' + stem(0) + ".xml");
+        m_pattern = m_fixture.makeFolder(QStringLiteral("pattern"));
+        LibraryFixture::fillFolder(m_pattern, {stem(0)});
+        QFile first(m_pattern + '/' + stem(0) + ".xml");
         QVERIFY(first.open(QIODevice::ReadOnly));
         const QByteArray bytes = first.readAll();
         const QByteArray name = stem(0).toUtf8();
         for (int number = 1; number < TITLES; ++number) {
-            QFile file(mPattern + '/' + stem(number) + ".xml");
+            QFile file(m_pattern + '/' + stem(number) + ".xml");
             QVERIFY(file.open(QIODevice::WriteOnly));
             file.write(QByteArray(bytes).replace(name, stem(number).toUtf8()));
-            ::link(qPrintable(mPattern + '/' + stem(0) + "_240.png"),
-                   qPrintable(mPattern + '/' + stem(number) + "_240.png"));
+            ::link(qPrintable(m_pattern + '/' + stem(0) + "_240.png"),
+                   qPrintable(m_pattern + '/' + stem(number) + "_240.png"));
         }
-        LibraryFixture::writeOrder(mPattern, stems());
+        LibraryFixture::writeOrder(m_pattern, stems());
     }
     static void spoil(const QString& folder, int number)
     {
@@ -109,7 +109,7 @@ private:
         const QString folder = makeFolder();
         m->list->refreshArchiveList(folder);
         m->canvas.clear();
-        mFolders.take();
+        m_folders.take();
         return folder;
     }
     // Without making items.
@@ -134,22 +134,22 @@ private:
         }
     }
 
-    LibraryFixture mFixture;
-    FakeEditContext mContext;
-    FakeTitlerFolderReporter mFolders;
-    FakeTitleChangeReporter mReports;
-    FakeMessageBoxController mMessages;
-    TouchDevice mDevice;
-    QString mPattern;
-    int mFolderNumber = 0;
+    LibraryFixture m_fixture;
+    FakeEditContext m_context;
+    FakeTitlerFolderReporter m_folders;
+    FakeTitleChangeReporter m_reports;
+    FakeMessageBoxController m_messages;
+    TouchDevice m_device;
+    QString m_pattern;
+    int m_folderNumber = 0;
     std::unique_ptr<TitleListFixture> m;
 };
 
 void tst_archivelist_longfolder::init()
 {
-    m = std::make_unique<TitleListFixture>(mDevice);
-    mMessages.take();
-    mReports.take();
+    m = std::make_unique<TitleListFixture>(m_device);
+    m_messages.take();
+    m_reports.take();
 }
 
 void tst_archivelist_longfolder::cleanup()
@@ -435,9 +435,9 @@ void tst_archivelist_longfolder::fullFolderTakesNoNewTitle()
     QSignalSpy picker(m->list, &ArchiveList::startTemplatePicker);
     m->holdAndChoose(0, ArchiveAction::ACTION_COPY);
     m->holdAndChoose(0, ArchiveAction::ACTION_PASTE);
-    QCOMPARE(mMessages.take(), (Reports{{113, QStringLiteral("99")}}));
+    QCOMPARE(m_messages.take(), (Reports{{113, QStringLiteral("99")}}));
     m->holdAndChoose(0, ArchiveAction::ACTION_CREATE);
-    QCOMPARE(mMessages.take(), (Reports{{112, QStringLiteral("99")}}));
+    QCOMPARE(m_messages.take(), (Reports{{112, QStringLiteral("99")}}));
     QCOMPARE(picker.size(), 0);
     QCOMPARE(m->list->count(), TITLES);
 }
@@ -451,7 +451,7 @@ void tst_archivelist_longfolder::manyUnreadableLeaveRoom()
     m->list->refreshArchiveList(folder);
     m->holdAndChoose(0, ArchiveAction::ACTION_COPY);
     m->holdAndChoose(0, ArchiveAction::ACTION_PASTE);
-    QCOMPARE(mMessages.take(), Reports());
+    QCOMPARE(m_messages.take(), Reports());
     QCOMPARE(m->list->count(), 51);
     QCOMPARE(m->selected(), 1);
     QCOMPARE(LibraryFixture::order(folder), listed());

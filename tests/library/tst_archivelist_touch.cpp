@@ -63,7 +63,7 @@ private:
     }
     QString folderOf(const QString& name, int titles)
     {
-        const QString folder = mFixture.makeFolder(name);
+        const QString folder = m_fixture.makeFolder(name);
         LibraryFixture::fillFolder(folder, numbered(titles));
         return folder;
     }
@@ -71,7 +71,7 @@ private:
     {
         const QString folder = folderOf(name, titles);
         m->open(folder);
-        mFolders.take();
+        m_folders.take();
         return folder;
     }
     Names enabledActions() const
@@ -83,22 +83,22 @@ private:
         return result;
     }
     void moveMode(bool on) { m->list->moveButtonClicked(on); }
-    QString templateRoot() const { return QDir::cleanPath(mFixture.titleRoot() + "/../usertemplates"); }
+    QString templateRoot() const { return QDir::cleanPath(m_fixture.titleRoot() + "/../usertemplates"); }
 
-    LibraryFixture mFixture;
-    FakeEditContext mContext;
-    FakeTitlerFolderReporter mFolders;
-    FakeTitleChangeReporter mReports;
-    FakeMessageBoxController mMessages;
-    TouchDevice mDevice;
+    LibraryFixture m_fixture;
+    FakeEditContext m_context;
+    FakeTitlerFolderReporter m_folders;
+    FakeTitleChangeReporter m_reports;
+    FakeMessageBoxController m_messages;
+    TouchDevice m_device;
     std::unique_ptr<TitleListFixture> m;
 };
 
 void tst_archivelist_touch::init()
 {
-    m = std::make_unique<TitleListFixture>(mDevice);
-    mMessages.take();
-    mReports.take();
+    m = std::make_unique<TitleListFixture>(m_device);
+    m_messages.take();
+    m_reports.take();
 }
 
 void tst_archivelist_touch::cleanup()
@@ -307,14 +307,14 @@ void tst_archivelist_touch::saveAsTemplate()
     m->open(folder);
     QSignalSpy added(m->list, &ArchiveList::addUserSignal);
     QSignalSpy picker(m->list, &ArchiveList::startUserTemplatePicker);
-    mReports.take();
+    m_reports.take();
 
     m->holdAndChoose(1, ArchiveAction::ACTION_ADD_USER);
     QCOMPARE(added.size(), 1);
     QCOMPARE(picker.size(), 1);
     const QString name = added.at(0).at(0).toString();
     QCOMPARE(name, QStringLiteral("UserTemplate_001"));
-    QCOMPARE(mReports.take(), (Reports{{5, name}}));
+    QCOMPARE(m_reports.take(), (Reports{{5, name}}));
     const QString made = templateRoot() + '/' + name;
     Archive saved;
     QVERIFY(ArchiveController().getOneArchive(made + "/Titler.xml", &saved));
@@ -355,12 +355,12 @@ void tst_archivelist_touch::templateLimit()
     LibraryFixture::writeOrder(templateRoot(), names);
     m->holdAndChoose(0, ArchiveAction::ACTION_ADD_USER);
     QCOMPARE(added.size(), 1); // the 999th can be made
-    QCOMPARE(mMessages.take(), Reports());
+    QCOMPARE(m_messages.take(), Reports());
     names.append(QStringLiteral("UserTemplate_999/Titler"));
     LibraryFixture::writeOrder(templateRoot(), names);
     m->holdAndChoose(0, ArchiveAction::ACTION_ADD_USER);
     QCOMPARE(added.size(), 1);
-    const Reports messages = mMessages.take();
+    const Reports messages = m_messages.take();
     QCOMPARE(messages.size(), 1);
     QCOMPARE(messages.at(0).first, 196);
     QDir(templateRoot()).removeRecursively();
@@ -374,12 +374,12 @@ void tst_archivelist_touch::carryDown()
     QVERIFY(m->list->getMoveState());
     QCOMPARE(m->list->count(), 3);
     QCOMPARE(m->list->getMoveItem()->parentWidget(), &m->window);
-    QCOMPARE(mFolders.take(), Names());
+    QCOMPARE(m_folders.take(), Names());
     m->release(List::HANDLE_X, 65 + List::ROW);
     QVERIFY(!m->list->getMoveState());
     QCOMPARE(m->stems(), (Names{"t01", "t00", "t02", "t03"}));
     QCOMPARE(LibraryFixture::order(folder), m->stems());
-    QCOMPARE(mFolders.take(), Names{"order down"});
+    QCOMPARE(m_folders.take(), Names{"order down"});
     QCOMPARE(m->stack.count(), 1);
     QCOMPARE(m->selected(), 1); // the title on the canvas is the same
     QCOMPARE(m->item(1)->styleSheet(), ArchiveItem::OPERATE_AND_SELECT_STATE);
@@ -387,7 +387,7 @@ void tst_archivelist_touch::carryDown()
     m->stack.undo();
     QCOMPARE(m->stems(), numbered(4));
     QCOMPARE(LibraryFixture::order(folder), m->stems());
-    QCOMPARE(mFolders.take(), Names{"order down"});
+    QCOMPARE(m_folders.take(), Names{"order down"});
     QCOMPARE(m->item(0)->styleSheet(), ArchiveItem::UN_OPERATE_AND_SELECT_STATE);
     m->stack.redo();
     QCOMPARE(m->stems(), (Names{"t01", "t00", "t02", "t03"}));
@@ -423,7 +423,7 @@ void tst_archivelist_touch::carryToTheSamePlace()
     QCOMPARE(m->stems(), numbered(4));
     QCOMPARE(m->stack.count(), 0);
     QCOMPARE(LibraryFixture::order(folder), numbered(4)); // it was saved all the same
-    QCOMPARE(mFolders.take(), Names{"order same"});
+    QCOMPARE(m_folders.take(), Names{"order same"});
     // A handle that is left at once lifts nothing.
     m->tap(List::HANDLE_X, 65);
     QCOMPARE(m->stems(), numbered(4));
@@ -527,7 +527,7 @@ void tst_archivelist_touch::cancelledCarryKeepsEveryTitle()
     const QString folder = openFolder(QStringLiteral("cancel"), 4);
     moveMode(true);
     m->liftTo(0, 65 + List::ROW);
-    QTouchEvent cancel(QEvent::TouchCancel, mDevice);
+    QTouchEvent cancel(QEvent::TouchCancel, m_device);
     QCoreApplication::sendEvent(m->list->viewport(), &cancel);
     QVERIFY(!m->list->getMoveState());
     QCOMPARE(m->stems(), numbered(4));
@@ -540,11 +540,11 @@ void tst_archivelist_touch::lockDuringATapOpensNoMenu()
     openFolder(QStringLiteral("locked"), 4);
     const std::unique_ptr<KSLockObject> lock(KSEventMutexLockObject::createFactory(nullptr));
     m->press(List::PICTURE_X, List::ROW + 60);
-    m->mFilter.lock(lock.get());
+    m->m_filter.lock(lock.get());
     m->release(List::PICTURE_X, List::ROW + 60);
     m->clock.advance(2 * List::HOLD_TIME);
     QVERIFY(!m->list->IsOptionMenuShowing());
-    m->mFilter.unlock();
+    m->m_filter.unlock();
     m->takeCanvas();
     m->tapTitle(2);
     QCOMPARE(m->takeCanvas(), Names{"t02"});
@@ -557,7 +557,7 @@ void tst_archivelist_touch::lockWhileCarryingPutsTheTitleBack()
     moveMode(true);
     m->liftTo(0, 65 + 2 * List::ROW);
     QVERIFY(m->list->isDragging());
-    m->mFilter.lock(lock.get());
+    m->m_filter.lock(lock.get());
     QVERIFY(!m->list->isDragging());
     QVERIFY(!m->list->getMoveState());
     QVERIFY(!m->list->getMoveItem());
@@ -565,7 +565,7 @@ void tst_archivelist_touch::lockWhileCarryingPutsTheTitleBack()
     QCOMPARE(LibraryFixture::order(folder), numbered(4));
     QCOMPARE(m->stack.count(), 0);
     m->release(List::HANDLE_X, 65 + 2 * List::ROW);
-    m->mFilter.unlock();
+    m->m_filter.unlock();
     m->carry(0, 65 + 2 * List::ROW);
     QCOMPARE(m->stems(), (Names{"t01", "t02", "t00", "t03"}));
     QCOMPARE(m->stack.count(), 1);
@@ -581,7 +581,7 @@ void tst_archivelist_touch::titleGoneFromUnderTheFinger_data()
     });
     QTest::newRow("its folder gets a new name") << Change([this](const QString& folder) {
         m->stack.clear();
-        const QString after = mFixture.titleRoot() + QStringLiteral("/finger after");
+        const QString after = m_fixture.titleRoot() + QStringLiteral("/finger after");
         QDir(after).removeRecursively();
         QVERIFY(QDir().rename(folder, after));
         m->list->refreshArchiveListForChangeFolderName(folder, after);
@@ -620,18 +620,18 @@ void tst_archivelist_touch::ninetyNineTitles()
     m->holdAndChoose(0, ArchiveAction::ACTION_COPY);
     m->holdAndChoose(0, ArchiveAction::ACTION_PASTE); // the 99th
     QCOMPARE(m->list->count(), 99);
-    QCOMPARE(mMessages.take(), Reports());
+    QCOMPARE(m_messages.take(), Reports());
     m->holdAndChoose(0, ArchiveAction::ACTION_PASTE);
-    QCOMPARE(mMessages.take(), (Reports{{113, QStringLiteral("99")}}));
+    QCOMPARE(m_messages.take(), (Reports{{113, QStringLiteral("99")}}));
     m->holdAndChoose(0, ArchiveAction::ACTION_CREATE);
-    QCOMPARE(mMessages.take(), (Reports{{112, QStringLiteral("99")}}));
+    QCOMPARE(m_messages.take(), (Reports{{112, QStringLiteral("99")}}));
     QCOMPARE(m->list->count(), 99);
 
     QSignalSpy picker(m->list, &ArchiveList::startTemplatePicker);
     m->holdAndChoose(2, ArchiveAction::ACTION_DELETE);
     m->holdAndChoose(0, ArchiveAction::ACTION_CREATE);
     QCOMPARE(picker.size(), 1);
-    QCOMPARE(mMessages.take(), Reports());
+    QCOMPARE(m_messages.take(), Reports());
     m->stack.undo();
     QCOMPARE(m->list->count(), 99);
     QCOMPARE(LibraryFixture::order(folder), m->stems());

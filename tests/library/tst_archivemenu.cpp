@@ -57,21 +57,21 @@ private:
         Names stems;
         for (int i = 0; i < titles; ++i)
             stems.append(QStringLiteral("t%1").arg(i, 2, 10, QLatin1Char('0')));
-        const QString folder = mFixture.makeFolder(name);
+        const QString folder = m_fixture.makeFolder(name);
         LibraryFixture::fillFolder(folder, stems);
         m->open(folder);
         newLogLines();
         return folder;
     }
-    QString templateRoot() const { return QDir::cleanPath(mFixture.titleRoot() + "/../usertemplates"); }
+    QString templateRoot() const { return QDir::cleanPath(m_fixture.titleRoot() + "/../usertemplates"); }
     // "[area] number: text" of what the operator did to the titles since the last call.
-    Names newLogLines() { return mLog.takeOperations().filter(QStringLiteral("[Thumbnail]")); }
+    Names newLogLines() { return m_log.takeOperations().filter(QStringLiteral("[Thumbnail]")); }
 
-    LibraryFixture mFixture;
-    LogFixture mLog;
-    FakeMessageBoxController mMessages;
-    TouchDevice mDevice;
-    std::unique_ptr<FakeTitlerAPPEventFilterController> mEvents;
+    LibraryFixture m_fixture;
+    LogFixture m_log;
+    FakeMessageBoxController m_messages;
+    TouchDevice m_device;
+    std::unique_ptr<FakeTitlerAPPEventFilterController> m_events;
     std::unique_ptr<TitleListFixture> m;
 };
 
@@ -83,15 +83,15 @@ void tst_archivemenu::init()
 {
     QDir(templateRoot()).removeRecursively();
     QVERIFY(QDir().mkpath(templateRoot()));
-    mEvents = std::make_unique<FakeTitlerAPPEventFilterController>();
-    m = std::make_unique<TitleListFixture>(mDevice);
-    mMessages.take();
+    m_events = std::make_unique<FakeTitlerAPPEventFilterController>();
+    m = std::make_unique<TitleListFixture>(m_device);
+    m_messages.take();
 }
 
 void tst_archivemenu::cleanup()
 {
     m.reset();
-    mEvents.reset();
+    m_events.reset();
 }
 
 void tst_archivemenu::siblingsHearOfTheMenuOnce_data()
@@ -101,7 +101,7 @@ void tst_archivemenu::siblingsHearOfTheMenuOnce_data()
     QTest::newRow("a press outside") << Closing([this] { m->tapTitle(5); });
     QTest::newRow("a key") << Closing([this] { QTest::keyClick(m->menu(), Qt::Key_Escape); });
     QTest::newRow("a sibling that asks to give way")
-        << Closing([this] { Q_EMIT mEvents->signalRestoreOriginal(); });
+        << Closing([this] { Q_EMIT m_events->signalRestoreOriginal(); });
     QTest::newRow("the window that closes") << Closing([this] { m->list->slotHideOptionMenu(); });
     QTest::newRow("a turn of the wheel") << Closing([this] {
         QWheelEvent event(QPointF(100, 100), m->list->mapToGlobal(QPointF(100, 100)), QPoint(),
@@ -115,13 +115,13 @@ void tst_archivemenu::siblingsHearOfTheMenuOnce()
     QFETCH(Closing, closing);
     openFolder(QStringLiteral("events"), 6);
     for (int round = 0; round < 2; ++round) { // the link is looked for at the first menu only
-        QCOMPARE(mEvents->take(), Events());
+        QCOMPARE(m_events->take(), Events());
         m->hold(List::PICTURE_X, 200);
         QVERIFY(m->list->IsOptionMenuShowing());
-        QCOMPARE(mEvents->take(), (Events{{2, true}}));
+        QCOMPARE(m_events->take(), (Events{{2, true}}));
         closing();
         QVERIFY(!m->list->IsOptionMenuShowing());
-        QCOMPARE(mEvents->take(), (Events{{2, false}}));
+        QCOMPARE(m_events->take(), (Events{{2, false}}));
     }
 }
 
@@ -130,12 +130,12 @@ void tst_archivemenu::requestToGiveWayWithoutAMenuIsNothing()
     openFolder(QStringLiteral("no menu"), 2);
     m->hold(List::PICTURE_X, 60);
     m->list->slotHideOptionMenu();
-    mEvents->take();
-    Q_EMIT mEvents->signalRestoreOriginal();
+    m_events->take();
+    Q_EMIT m_events->signalRestoreOriginal();
     m->list->slotHideOptionMenu();
-    QCOMPARE(mEvents->take(), Events());
+    QCOMPARE(m_events->take(), Events());
     // Without a link the menu is this process' own.
-    mEvents.reset();
+    m_events.reset();
     m->hold(List::PICTURE_X, 60);
     QVERIFY(m->list->IsOptionMenuShowing());
     m->list->slotHideOptionMenu();
@@ -242,7 +242,7 @@ void tst_archivemenu::fullTemplateListTellsTheFreeName()
     LibraryFixture::writeOrder(templateRoot(), rows);
     QSignalSpy added(m->list, &ArchiveList::addUserSignal);
     m->holdAndChoose(0, ArchiveAction::ACTION_ADD_USER);
-    QCOMPARE(mMessages.take(), messages);
+    QCOMPARE(m_messages.take(), messages);
     QCOMPARE(added.size(), messages.isEmpty() ? 1 : 0);
 }
 

@@ -52,8 +52,8 @@ class tst_foldernamerules : public QObject
 private Q_SLOTS:
     void init()
     {
-        QDir(mFixture.titleRoot()).removeRecursively();
-        QDir().mkpath(mFixture.titleRoot());
+        QDir(m_fixture.titleRoot()).removeRecursively();
+        QDir().mkpath(m_fixture.titleRoot());
         qunsetenv("K2SYS_FS_REMAIN");
     }
 
@@ -175,7 +175,7 @@ private Q_SLOTS:
     {
         QFETCH(QString, name);
         FolderPickerController disk;
-        QCOMPARE(disk.getTitlerRootFolder(), mFixture.titleRoot());
+        QCOMPARE(disk.getTitlerRootFolder(), m_fixture.titleRoot());
         QVERIFY(disk.createFolder(root(), name));
         QVERIFY(QFileInfo(path(name)).isDir());
         QVERIFY(disk.isNullDirectory(QFileInfo(path(name))));
@@ -200,7 +200,7 @@ private Q_SLOTS:
     {
         QFETCH(QString, name);
         FolderPickerController disk;
-        LibraryFixture::fillFolder(mFixture.makeFolder("old"), {"t1", "t2"});
+        LibraryFixture::fillFolder(m_fixture.makeFolder("old"), {"t1", "t2"});
         const auto before = contents(path("old"));
         QVERIFY(disk.renameFolder(root(), "old", name));
         QVERIFY(!QFileInfo::exists(path("old")));
@@ -210,7 +210,7 @@ private Q_SLOTS:
     void renamesToAnotherCase()
     {
         FolderPickerController disk;
-        mFixture.makeFolder("news");
+        m_fixture.makeFolder("news");
         QVERIFY(disk.renameFolder(root(), "news", "NEWS"));
         QCOMPARE(folders(), QStringList{"NEWS"});
         QVERIFY(!disk.renameFolder(root(), "NEWS", "NEWS"));
@@ -219,9 +219,9 @@ private Q_SLOTS:
     void aRenameNeverReplaces()
     {
         FolderPickerController disk;
-        LibraryFixture::fillFolder(mFixture.makeFolder("full"), {"t1"});
-        mFixture.makeFolder("empty");
-        mFixture.makeFolder("other");
+        LibraryFixture::fillFolder(m_fixture.makeFolder("full"), {"t1"});
+        m_fixture.makeFolder("empty");
+        m_fixture.makeFolder("other");
         const auto before = contents(path("full"));
         QVERIFY(!disk.renameFolder(root(), "other", "full"));
         QVERIFY(!disk.renameFolder(root(), "other", "empty"));
@@ -238,7 +238,7 @@ private Q_SLOTS:
     {
         QFETCH(QString, name);
         FolderPickerController disk;
-        LibraryFixture::fillFolder(mFixture.makeFolder("source"), {"t2", "t1"});
+        LibraryFixture::fillFolder(m_fixture.makeFolder("source"), {"t2", "t1"});
         QVERIFY(disk.duplicateFolder(root(), path("source"), name));
         QCOMPARE(contents(path(name)), contents(path("source")));
         QCOMPARE(LibraryFixture::order(path(name)), QStringList({"t2", "t1"}));
@@ -247,8 +247,8 @@ private Q_SLOTS:
     void aDuplicateNeverReplaces()
     {
         FolderPickerController disk;
-        LibraryFixture::fillFolder(mFixture.makeFolder("source"), {"t1"});
-        LibraryFixture::fillFolder(mFixture.makeFolder("other"), {"t9"});
+        LibraryFixture::fillFolder(m_fixture.makeFolder("source"), {"t1"});
+        LibraryFixture::fillFolder(m_fixture.makeFolder("other"), {"t9"});
         const auto before = contents(path("other"));
         QVERIFY(!disk.duplicateFolder(root(), path("source"), "other"));
         QVERIFY(!disk.duplicateFolder(root(), path("source"), "source"));
@@ -260,8 +260,8 @@ private Q_SLOTS:
     void foldersThatCannotBeRead()
     {
         FolderPickerController disk;
-        LibraryFixture::fillFolder(mFixture.makeFolder("source"), {"t1"});
-        LibraryFixture::fillFolder(mFixture.makeFolder("locked"), {"t1"});
+        LibraryFixture::fillFolder(m_fixture.makeFolder("source"), {"t1"});
+        LibraryFixture::fillFolder(m_fixture.makeFolder("locked"), {"t1"});
         QFile::setPermissions(path("locked"), QFileDevice::Permissions());
         QFile::setPermissions(root(), QFileDevice::ReadOwner | QFileDevice::ExeOwner |
                                           QFileDevice::ReadOther | QFileDevice::ExeOther);
@@ -304,14 +304,14 @@ private Q_SLOTS:
         QFETCH(QByteArray, remain);
         QFETCH(bool, full);
         qputenv("K2SYS_FS_REMAIN", remain);
-        mFixture.makeFolder("empty");
+        m_fixture.makeFolder("empty");
         QCOMPARE(FolderPickerController().isDiskFull(root(), false), full);
         QCOMPARE(FolderPickerController().isDiskFull(path("empty"), true), full);
     }
 
     void aDuplicateNeedsItsOwnRoom()
     {
-        const QString folder = mFixture.makeFolder("source");
+        const QString folder = m_fixture.makeFolder("source");
         QFile file(folder + "/data");
         QVERIFY(file.open(QIODevice::WriteOnly));
         file.write(QByteArray(50000, 'x'));
@@ -327,11 +327,11 @@ private Q_SLOTS:
 
     void theTreeShowsFoldersWithTheirTitles()
     {
-        LibraryFixture::fillFolder(mFixture.makeFolder("news"), {"t2", "t1", "t3"});
+        LibraryFixture::fillFolder(m_fixture.makeFolder("news"), {"t2", "t1", "t3"});
         QFile::remove(path("news") + "/t3.xml");
-        mFixture.makeFolder(QStringLiteral("天气"));
-        mFixture.makeFolder("Arts");
-        LibraryFixture::fillFolder(mFixture.makeFolder("zoo"), {"a", "b"});
+        m_fixture.makeFolder(QStringLiteral("天气"));
+        m_fixture.makeFolder("Arts");
+        LibraryFixture::fillFolder(m_fixture.makeFolder("zoo"), {"a", "b"});
         QFile::remove(path("zoo") + "/.order.xml");
         QFile stray(root() + "/stray.xml");
         QVERIFY(stray.open(QIODevice::WriteOnly));
@@ -345,7 +345,7 @@ private Q_SLOTS:
 
     void attributesOfRows()
     {
-        LibraryFixture::fillFolder(mFixture.makeFolder("news"), {"t1"});
+        LibraryFixture::fillFolder(m_fixture.makeFolder("news"), {"t1"});
         Tree tree(root());
         const QModelIndex folder = tree.row("news");
         const QModelIndex date = folder.siblingAtColumn(FolderPickerFactory::DateColumn);
@@ -371,8 +371,8 @@ private Q_SLOTS:
 
     void ordersThatNameStrangeThings()
     {
-        const QString folder = mFixture.makeFolder("news");
-        LibraryFixture::fillFolder(mFixture.makeFolder("other"), {"o1"});
+        const QString folder = m_fixture.makeFolder("news");
+        LibraryFixture::fillFolder(m_fixture.makeFolder("other"), {"o1"});
         LibraryFixture::fillFolder(folder, {"t1", "t2"});
         LibraryFixture::writeOrder(folder, {"t2", "../other/o1", "", "gone", "t1"});
         QDir(folder).mkdir("gone.xml");
@@ -388,8 +388,8 @@ private Q_SLOTS:
 
     void whetherAFolderHasTitles()
     {
-        LibraryFixture::fillFolder(mFixture.makeFolder("gaps"), {"t1", "t2", "t3"});
-        LibraryFixture::fillFolder(mFixture.makeFolder("none"), {"t1"});
+        LibraryFixture::fillFolder(m_fixture.makeFolder("gaps"), {"t1", "t2", "t3"});
+        LibraryFixture::fillFolder(m_fixture.makeFolder("none"), {"t1"});
         for (const char* title : {"gaps/t1.xml", "gaps/t2.xml", "none/t1.xml"})
             QVERIFY(QFile::remove(path(title)));
         FolderPickerFactory factory;
@@ -415,8 +415,8 @@ private Q_SLOTS:
 
     void handlesOutliveRenamesAndReadings()
     {
-        LibraryFixture::fillFolder(mFixture.makeFolder("a"), {"t1"});
-        LibraryFixture::fillFolder(mFixture.makeFolder("b"), {"t2"});
+        LibraryFixture::fillFolder(m_fixture.makeFolder("a"), {"t1"});
+        LibraryFixture::fillFolder(m_fixture.makeFolder("b"), {"t2"});
         FolderPickerFactory factory;
         factory.setRootPath(root());
         factory.importSourceData();
@@ -486,14 +486,14 @@ private:
         QTest::newRow("as an option") << QStringLiteral("-rf");
     }
 
-    QString root() const { return mFixture.titleRoot(); }
+    QString root() const { return m_fixture.titleRoot(); }
     QString path(const QString& name) const { return root() + QLatin1Char('/') + name; }
     QStringList folders() const
     {
         return QDir(root()).entryList(QDir::Dirs | QDir::NoDotAndDotDot, QDir::Name);
     }
 
-    LibraryFixture mFixture;
+    LibraryFixture m_fixture;
 };
 
 QTEST_MAIN(tst_foldernamerules)

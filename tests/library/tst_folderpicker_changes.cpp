@@ -491,7 +491,7 @@ private Q_SLOTS:
                 const bool isListed = names.contains(folder);
                 QVERIFY2(isListed, qPrintable(done + ": " + folder + " is not in " + names.join('|')));
             }
-            QVERIFY2(names.size() - folders.size() <= 1 + mRefused,
+            QVERIFY2(names.size() - folders.size() <= 1 + m_refused,
                      qPrintable(done + ": " + names.join('|')));
         }
         // Read anew, it is the disk exactly.
@@ -556,7 +556,7 @@ private:
         case 12:
             if (folders.size() > 3) {
                 // A copy whose source goes leaves a row without a folder.
-                mRefused += f.picker->editAction() == FolderPicker::FOLDER_EDIT_DUPLICATE ? 1 : 0;
+                m_refused += f.picker->editAction() == FolderPicker::FOLDER_EDIT_DUPLICATE ? 1 : 0;
                 deleteOutside(folder);
             }
             break;
@@ -595,7 +595,7 @@ private:
     }
     QLabel* thumbnail() const { return f.picker->findChild<QLabel*>("folderThumbnail"); }
 
-    int mRefused = 0; // rows that may stand for no folder
+    int m_refused = 0; // rows that may stand for no folder
     FolderPickerFixture f;
 };
 

@@ -15,7 +15,7 @@ class tst_folderpicker_taps : public QObject
     Q_OBJECT
 
 public:
-    explicit tst_folderpicker_taps(LogFixture& log) : mLog(log) {}
+    explicit tst_folderpicker_taps(LogFixture& log) : m_log(log) {}
 
 private Q_SLOTS:
     void initTestCase()
@@ -154,10 +154,10 @@ private Q_SLOTS:
         f.make("news");
         f.open();
         f.tap("news");
-        mLog.takeDebugLines(QString());
+        m_log.takeDebugLines(QString());
         f.tapButton("openFolderButton");
         const QString id = QString::number(f.window->winId());
-        QCOMPARE(mLog.takeDebugLines("KSInputContext"), QStringList("200: App Name:Titler***WID:" + id));
+        QCOMPARE(m_log.takeDebugLines("KSInputContext"), QStringList("200: App Name:Titler***WID:" + id));
     }
 
     // --- Names ----------------------------------------------------------------------------------------
@@ -262,7 +262,7 @@ private Q_SLOTS:
     {
         for (const char* name : {"b", "c", "a"})
             f.make(QLatin1String(name));
-        mLog.takeOperations(QString());
+        m_log.takeOperations(QString());
         f.open();
         QCOMPARE(fileList(), QStringList());
         tapHeader(FolderPickerFactory::NameColumn);
@@ -286,7 +286,7 @@ private Q_SLOTS:
         f.make("a");
         f.make("b");
         f.open();
-        mLog.takeOperations(QString());
+        m_log.takeOperations(QString());
         f.hold("a");
         f.type("c");
         tapHeader(FolderPickerFactory::NameColumn);
@@ -301,7 +301,7 @@ private Q_SLOTS:
         f.make("a");
         f.make("b");
         f.open();
-        mLog.takeOperations(QString());
+        m_log.takeOperations(QString());
         const QWidget* header = f.tree()->header()->viewport();
         const QPoint name = header->mapTo(f.picker.get(), sectionCenter(FolderPickerFactory::NameColumn));
         const QPoint date = header->mapTo(f.picker.get(), sectionCenter(FolderPickerFactory::DateColumn));
@@ -327,7 +327,7 @@ private Q_SLOTS:
     void everyTapIsLogged()
     {
         f.make("news", {"t1"});
-        mLog.takeOperations(QString());
+        m_log.takeOperations(QString());
         f.open();
         QCOMPARE(folderArea(), QStringList());
         f.tap("news");
@@ -372,12 +372,12 @@ private:
                 header->height() / 2};
     }
     void tapHeader(int column) { f.tap(f.tree()->header()->viewport(), sectionCenter(column)); }
-    QStringList fileList() { return mLog.takeOperations(QStringLiteral("File List")); }
-    QStringList folderArea() { return mLog.takeOperations(QStringLiteral("Folder Area")); }
+    QStringList fileList() { return m_log.takeOperations(QStringLiteral("File List")); }
+    QStringList folderArea() { return m_log.takeOperations(QStringLiteral("Folder Area")); }
     QLabel* thumbnail() const { return f.picker->findChild<QLabel*>("folderThumbnail"); }
     QLabel* sizeLabel() const { return f.picker->findChild<QLabel*>("folderFileSize"); }
 
-    LogFixture& mLog;
+    LogFixture& m_log;
     FolderPickerFixture f;
 };
 

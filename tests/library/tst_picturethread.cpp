@@ -48,13 +48,13 @@ private Q_SLOTS:
     void deletedTitleKeepsNoPictures();
 
 private:
-    LibraryFixture mFixture;
+    LibraryFixture m_fixture;
 };
 
 void tst_picturethread::finishedStates()
 {
     FakeTitleChangeReporter reporter(FakeTitleChangeReporter::Pictures::Hold);
-    const auto archive = LibraryFixture::makeRecord(mFixture.makeFolder(QStringLiteral("states")),
+    const auto archive = LibraryFixture::makeRecord(m_fixture.makeFolder(QStringLiteral("states")),
                                                     QStringLiteral("t"), QString());
     PictureThread thread;
     QVERIFY(thread.isThreadWaiting());
@@ -68,7 +68,7 @@ void tst_picturethread::finishedStates()
 
 void tst_picturethread::refusedJobs()
 {
-    const auto archive = LibraryFixture::makeRecord(mFixture.makeFolder(QStringLiteral("refused")),
+    const auto archive = LibraryFixture::makeRecord(m_fixture.makeFolder(QStringLiteral("refused")),
                                                     QStringLiteral("t"), QString());
     PictureThread thread;
     thread.addArchive(nullptr, pictures(Qt::red));
@@ -81,7 +81,7 @@ void tst_picturethread::refusedJobs()
 void tst_picturethread::filesAndSizes()
 {
     FakeTitleChangeReporter reports;
-    const QString folder = mFixture.makeFolder(QStringLiteral("sizes"));
+    const QString folder = m_fixture.makeFolder(QStringLiteral("sizes"));
     const auto archive = LibraryFixture::makeRecord(folder, QStringLiteral("t"), QString());
     PictureThread thread;
     thread.addArchive(archive.get(), pictures(QColor(10, 120, 230)));
@@ -103,7 +103,7 @@ void tst_picturethread::filesAndSizes()
 
 void tst_picturethread::transparentParts()
 {
-    const QString folder = mFixture.makeFolder(QStringLiteral("transparent"));
+    const QString folder = m_fixture.makeFolder(QStringLiteral("transparent"));
     const auto archive = LibraryFixture::makeRecord(folder, QStringLiteral("t"), QString());
     PictureThread thread;
     thread.addArchive(archive.get(), pictures(Qt::transparent));
@@ -120,7 +120,7 @@ void tst_picturethread::transparentParts()
 void tst_picturethread::jobQueuedAtTheEndIsNeverWritten()
 {
     FakeTitleChangeReporter reporter(FakeTitleChangeReporter::Pictures::Hold);
-    const QString folder = mFixture.makeFolder(QStringLiteral("dropped"));
+    const QString folder = m_fixture.makeFolder(QStringLiteral("dropped"));
     const auto first = LibraryFixture::makeRecord(folder, QStringLiteral("first"), QString());
     const auto second = LibraryFixture::makeRecord(folder, QStringLiteral("second"), QString());
     auto thread = std::make_unique<PictureThread>();
@@ -143,7 +143,7 @@ void tst_picturethread::jobQueuedAtTheEndIsNeverWritten()
 void tst_picturethread::jobsAreWrittenInOrder()
 {
     FakeTitleChangeReporter reports;
-    const QString folder = mFixture.makeFolder(QStringLiteral("in order"));
+    const QString folder = m_fixture.makeFolder(QStringLiteral("in order"));
     PictureThread thread;
     Reports expected;
     for (int i = 0; i < 4; ++i) {
@@ -169,14 +169,14 @@ void tst_picturethread::unwritableFolderIsPassedOver()
 
 void tst_picturethread::namesThatLeaveTheFolderAreNotWritten()
 {
-    const QString folder = mFixture.makeFolder(QStringLiteral("names"));
+    const QString folder = m_fixture.makeFolder(QStringLiteral("names"));
     const auto archive = LibraryFixture::makeRecord(folder, QStringLiteral("t"), QString());
     archive->setThumbnailBig("../stray.png");
     archive->setThumbnailBlack("");
     PictureThread thread;
     thread.addArchive(archive.get(), pictures(Qt::red));
     QTRY_VERIFY(thread.isThreadWaiting());
-    QVERIFY(!QFile::exists(mFixture.titleRoot() + QStringLiteral("/stray.png")));
+    QVERIFY(!QFile::exists(m_fixture.titleRoot() + QStringLiteral("/stray.png")));
     QCOMPARE(settledEntries(folder), (QStringList{QStringLiteral("t_240.png"), QStringLiteral("t_960.png")}));
 }
 
@@ -191,7 +191,7 @@ void tst_picturethread::namesOfTitlesAreNoPictures()
 {
     QFETCH(bool, isDeletedMeanwhile);
     FakeTitleChangeReporter reporter(FakeTitleChangeReporter::Pictures::Hold);
-    const QString folder = mFixture.makeFolder(QStringLiteral("titles"));
+    const QString folder = m_fixture.makeFolder(QStringLiteral("titles"));
     LibraryFixture::fillFolder(folder, {QStringLiteral("t"), QStringLiteral("other")});
     const auto archive = LibraryFixture::makeRecord(folder, QStringLiteral("t"), QString());
     archive->setThumbnailBig("other.xml");
@@ -223,7 +223,7 @@ void tst_picturethread::deletedTitleKeepsNoPictures()
 {
     QFETCH(bool, isBeingWritten);
     FakeTitleChangeReporter reporter(FakeTitleChangeReporter::Pictures::Hold);
-    const QString folder = mFixture.makeFolder(QStringLiteral("deleted"));
+    const QString folder = m_fixture.makeFolder(QStringLiteral("deleted"));
     LibraryFixture::fillFolder(folder, {QStringLiteral("gone"), QStringLiteral("kept")});
     const auto gone = LibraryFixture::makeRecord(folder, QStringLiteral("gone"), QString());
     const auto kept = LibraryFixture::makeRecord(folder, QStringLiteral("kept"), QString());

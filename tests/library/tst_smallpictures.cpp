@@ -27,13 +27,13 @@ private:
         for (int i = 0; i < count; ++i) {
             QImage image(size, QImage::Format_RGB32);
             image.fill(QColor(i, 10, 10));
-            paths.append(mFolder.filePath(QString::number(i) + QStringLiteral(".png")));
+            paths.append(m_folder.filePath(QString::number(i) + QStringLiteral(".png")));
             image.save(paths.constLast());
         }
         return paths;
     }
 
-    QTemporaryDir mFolder;
+    QTemporaryDir m_folder;
 };
 
 void tst_smallpictures::eachPictureComesAtItsPlace()
@@ -59,15 +59,15 @@ void tst_smallpictures::takenBeforeItsTurn()
 
 void tst_smallpictures::whatIsNoPictureIsNull()
 {
-    const QString text = mFolder.filePath(QStringLiteral("text.png"));
+    const QString text = m_folder.filePath(QStringLiteral("text.png"));
     QFile file(text);
     QVERIFY(file.open(QIODevice::WriteOnly));
     file.write("no picture");
     file.close();
-    const QString pipe = mFolder.filePath(QStringLiteral("pipe.png"));
+    const QString pipe = m_folder.filePath(QStringLiteral("pipe.png"));
     QCOMPARE(mkfifo(pipe.toLocal8Bit().constData(), 0600), 0);
-    SmallPictures pictures({text, pipe, mFolder.path(), QString(), mFolder.filePath(QStringLiteral("gone"))},
-                           BOUNDS);
+    SmallPictures pictures(
+        {text, pipe, m_folder.path(), QString(), m_folder.filePath(QStringLiteral("gone"))}, BOUNDS);
     for (qsizetype i = 0; i < pictures.count(); ++i)
         QVERIFY(pictures.take(i).isNull());
 }

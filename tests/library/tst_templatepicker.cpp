@@ -31,12 +31,12 @@ private Q_SLOTS:
 
     void init()
     {
-        mFixture.resetTemplates();
-        mReports.take();
-        mMessages.take();
+        m_fixture.resetTemplates();
+        m_reports.take();
+        m_messages.take();
     }
 
-    void cleanup() { mPicker.reset(); }
+    void cleanup() { m_picker.reset(); }
 
     void reloadRules_data()
     {
@@ -71,8 +71,8 @@ private Q_SLOTS:
 
     void setsOfTheController()
     {
-        mFixture.makePresets("templates_en", {"lower"});
-        mFixture.makePresets("templates_chs", {"xia", "zhong"});
+        m_fixture.makePresets("templates_en", {"lower"});
+        m_fixture.makePresets("templates_chs", {"xia", "zhong"});
         TemplatePickerController controller;
         const auto count = [&](int language, bool pin) {
             const QVector<Archive*> templates =
@@ -89,24 +89,24 @@ private Q_SLOTS:
 
     void presetsFollowTheLanguage()
     {
-        mFixture.makePresets("templates_en", {"lower", "strap"});
-        mFixture.makePresets("templates_chs", {"xia"});
+        m_fixture.makePresets("templates_en", {"lower", "strap"});
+        m_fixture.makePresets("templates_chs", {"xia"});
         open();
         QCOMPARE(names(presets()), QStringList({"lower", "strap"}));
-        mPicker->reloadTemplates(SystemSetupDef::emSystemLanguageEnglish);
+        m_picker->reloadTemplates(SystemSetupDef::emSystemLanguageEnglish);
         QCOMPARE(names(presets()), QStringList({"lower", "strap"}));
         tapItem(presets(), 1);
         // The same language again reads nothing: the choice stays.
         TemplateItem* chosen = presets()->selectedItem();
-        mPicker->reloadTemplates(SystemSetupDef::emSystemLanguageEnglish);
+        m_picker->reloadTemplates(SystemSetupDef::emSystemLanguageEnglish);
         QCOMPARE(presets()->selectedItem(), chosen);
-        mPicker->reloadTemplates(SystemSetupDef::emSystemLanguageChinese);
+        m_picker->reloadTemplates(SystemSetupDef::emSystemLanguageChinese);
         QCOMPARE(names(presets()), QStringList({"xia"}));
         QVERIFY(!presets()->selectedItem());
         QVERIFY(!button("selectPresetButton")->isEnabled());
         // Each set knows its last choice.
         tapItem(presets(), 0);
-        mPicker->reloadTemplates(SystemSetupDef::emSystemLanguageEnglish);
+        m_picker->reloadTemplates(SystemSetupDef::emSystemLanguageEnglish);
         QCOMPARE(presets()->selectedItem(), presets()->item(1));
         QVERIFY(hasSelectedStyle(presets()->item(1)));
         QVERIFY(button("selectPresetButton")->isEnabled());
@@ -114,11 +114,11 @@ private Q_SLOTS:
 
     void theModelOfTheApplianceChangesNoSet()
     {
-        mFixture.makePresets("templates_en", {"lower"});
-        mFixture.makePresets("templates_chs", {"xia"});
+        m_fixture.makePresets("templates_en", {"lower"});
+        m_fixture.makePresets("templates_chs", {"xia"});
         open();
-        mPicker->setModuleInfo(SystemSetupDef::emInformationModelChina);
-        mPicker->reloadTemplates(SystemSetupDef::emSystemLanguageEnglish);
+        m_picker->setModuleInfo(SystemSetupDef::emInformationModelChina);
+        m_picker->reloadTemplates(SystemSetupDef::emSystemLanguageEnglish);
         QCOMPARE(names(presets()), QStringList{"lower"});
     }
 
@@ -130,35 +130,35 @@ private Q_SLOTS:
         QVERIFY(!button("selectPresetButton")->isEnabled());
         QVERIFY(!button("selectUserButton")->isEnabled());
         QVERIFY(!button("deleteTemplateButton")->isEnabled());
-        QSignalSpy selected(mPicker.get(), &TemplatePicker::selectedTemplate);
-        mPicker->selectClicked();
-        mPicker->selectClicked2();
-        mPicker->deleteClicked2();
+        QSignalSpy selected(m_picker.get(), &TemplatePicker::selectedTemplate);
+        m_picker->selectClicked();
+        m_picker->selectClicked2();
+        m_picker->deleteClicked2();
         QVERIFY(selected.isEmpty());
-        QVERIFY(mMessages.take().isEmpty());
-        QVERIFY(mPicker->isVisible());
+        QVERIFY(m_messages.take().isEmpty());
+        QVERIFY(m_picker->isVisible());
     }
 
     void placesInTheGrid()
     {
-        mFixture.makePresets("templates_en", {"a", "b", "c", "d", "e"});
+        m_fixture.makePresets("templates_en", {"a", "b", "c", "d", "e"});
         open();
         QCOMPARE(presets()->item(3)->pos(), QPoint(3 * 258, 0));
         QCOMPARE(presets()->item(4)->pos(), QPoint(0, 153));
         QCOMPARE(presets()->item(4)->size(), QSize(248, 143));
         QCOMPARE(presets()->scrollArea()->size(), QSize(1049, 595));
         // The fourth column is not under the scroll bar.
-        mFixture.makeUserTemplates(13);
+        m_fixture.makeUserTemplates(13);
         UserTemplateManager::cleanUp();
-        mPicker->reloadTemplates2();
-        mPicker->showUserTemplateTab();
+        m_picker->reloadTemplates2();
+        m_picker->showUserTemplateTab();
         QTRY_VERIFY(users()->scrollArea()->verticalScrollBar()->isVisible());
         QVERIFY(users()->scrollArea()->viewport()->width() >= 4 * 248 + 3 * 10);
     }
 
     void textsStandInTheirBox()
     {
-        mFixture.makeUserTemplate("UserTemplate_001", {"Evening News"});
+        m_fixture.makeUserTemplate("UserTemplate_001", {"Evening News"});
         openUserTab();
         QCOMPARE(preview()->size().width(), fileName()->width());
         QCOMPARE(preview()->x(), fileName()->x());
@@ -174,15 +174,15 @@ private Q_SLOTS:
     void cornersAreNotPartOfTheDialog()
     {
         open();
-        QVERIFY(!mPicker->mask().isEmpty());
-        QVERIFY(!mPicker->mask().contains(QPoint(0, 0)));
-        QVERIFY(!mPicker->mask().contains(QPoint(mPicker->width() - 1, mPicker->height() - 1)));
-        QVERIFY(mPicker->mask().contains(mPicker->rect().center()));
+        QVERIFY(!m_picker->mask().isEmpty());
+        QVERIFY(!m_picker->mask().contains(QPoint(0, 0)));
+        QVERIFY(!m_picker->mask().contains(QPoint(m_picker->width() - 1, m_picker->height() - 1)));
+        QVERIFY(m_picker->mask().contains(m_picker->rect().center()));
     }
 
     void aTapChoosesAndSelectTakes()
     {
-        mFixture.makePresets("templates_en", {"a", "b", "c"}, true);
+        m_fixture.makePresets("templates_en", {"a", "b", "c"}, true);
         open();
         QVERIFY(!button("selectPresetButton")->isEnabled());
         QVERIFY(!button("selectUserButton")->isVisible());
@@ -192,17 +192,17 @@ private Q_SLOTS:
         QVERIFY(hasSelectedStyle(presets()->item(2)));
         QVERIFY(button("selectPresetButton")->isEnabled());
 
-        mPicker->setSelectedItem(false);
+        m_picker->setSelectedItem(false);
         QStringList taken;
-        connect(mPicker.get(), &TemplatePicker::selectedTemplate, this, [&](Archive* archive) {
-            QVERIFY(mPicker->isSelectedItem());
+        connect(m_picker.get(), &TemplatePicker::selectedTemplate, this, [&](Archive* archive) {
+            QVERIFY(m_picker->isSelectedItem());
             taken.append(QString::fromStdString(archive->getName()));
             QVERIFY(archive->isPreset());
         });
         tap(button("selectPresetButton"));
         QCOMPARE(taken, QStringList{"c"});
-        QTRY_VERIFY(!mPicker->isVisible());
-        QCOMPARE(mPicker->result(), int(QDialog::Accepted));
+        QTRY_VERIFY(!m_picker->isVisible());
+        QCOMPARE(m_picker->result(), int(QDialog::Accepted));
 
         // The choice is kept by the open program and by the next one.
         QCOMPARE(presets()->selectedItem(), presets()->item(2));
@@ -214,36 +214,36 @@ private Q_SLOTS:
 
     void theMouseServesAsWell()
     {
-        mFixture.makePresets("templates_en", {"a", "b"});
+        m_fixture.makePresets("templates_en", {"a", "b"});
         open();
         QTest::mouseClick(presets()->item(1), Qt::LeftButton);
         QCOMPARE(presets()->selectedItem(), presets()->item(1));
-        QSignalSpy selected(mPicker.get(), &TemplatePicker::selectedTemplate);
+        QSignalSpy selected(m_picker.get(), &TemplatePicker::selectedTemplate);
         QTest::mouseClick(button("selectPresetButton"), Qt::LeftButton);
         QCOMPARE(selected.size(), 1);
-        QVERIFY(!mPicker->isVisible());
+        QVERIFY(!m_picker->isVisible());
     }
 
     void cancelTakesNothing()
     {
-        mFixture.makePresets("templates_en", {"a"});
+        m_fixture.makePresets("templates_en", {"a"});
         open();
         tapItem(presets(), 0);
-        QSignalSpy selected(mPicker.get(), &TemplatePicker::selectedTemplate);
+        QSignalSpy selected(m_picker.get(), &TemplatePicker::selectedTemplate);
         tap(button("cancelTemplateButton"));
-        QTRY_VERIFY(!mPicker->isVisible());
+        QTRY_VERIFY(!m_picker->isVisible());
         QVERIFY(selected.isEmpty());
-        QVERIFY(!mPicker->isSelectedItem());
+        QVERIFY(!m_picker->isSelectedItem());
         QCOMPARE(presets()->selectedItem(), presets()->item(0));
     }
 
     void aLastChoiceThatIsGone()
     {
-        mFixture.makePresets("templates_en", {"a", "b"});
+        m_fixture.makePresets("templates_en", {"a", "b"});
         open();
         tapItem(presets(), 1);
-        mPicker.reset();
-        QVERIFY(QFile::remove(mFixture.presetRoot() + "/templates_en/b.xml"));
+        m_picker.reset();
+        QVERIFY(QFile::remove(m_fixture.presetRoot() + "/templates_en/b.xml"));
         TemplateManager::cleanUp();
         open();
         QCOMPARE(names(presets()), QStringList{"a"});
@@ -255,9 +255,9 @@ private Q_SLOTS:
 
     void userTabShowsNameAndTexts()
     {
-        mFixture.makeUserTemplate("first", {"one text"});
-        mFixture.makeUserTemplate("a name that is much too long for the place where it has to stand",
-                                  {"Breaking", "快讯", "third"});
+        m_fixture.makeUserTemplate("first", {"one text"});
+        m_fixture.makeUserTemplate("a name that is much too long for the place where it has to stand",
+                                   {"Breaking", "快讯", "third"});
         open();
         tapTab(1);
         QVERIFY(button("selectUserButton")->isVisible());
@@ -274,7 +274,7 @@ private Q_SLOTS:
                 fileName()->width());
         QCOMPARE(textLines(preview()).mid(0, 3), QStringList({"Breaking", "快讯", "third"}));
 
-        QSignalSpy selected(mPicker.get(), &TemplatePicker::selectedTemplate);
+        QSignalSpy selected(m_picker.get(), &TemplatePicker::selectedTemplate);
         tap(button("selectUserButton"));
         QCOMPARE(selected.size(), 1);
         QCOMPARE(selected[0][0].value<Archive*>(), users()->archive(1));
@@ -282,9 +282,9 @@ private Q_SLOTS:
 
     void theLastChoiceIsTold()
     {
-        mFixture.makeUserTemplate("UserTemplate_001", {"one", "two"});
+        m_fixture.makeUserTemplate("UserTemplate_001", {"one", "two"});
         UserTemplatePickerController().saveSelectedTemplate(
-            mFixture.userTitle("UserTemplate_001").toStdString());
+            m_fixture.userTitle("UserTemplate_001").toStdString());
         openUserTab();
         QCOMPARE(users()->selectedItem(), users()->item(0));
         QCOMPARE(fileName()->text(), QString("UserTemplate_001"));
@@ -294,13 +294,13 @@ private Q_SLOTS:
 
     void deleteAsksAndDeletes()
     {
-        mFixture.makeUserTemplates(5);
+        m_fixture.makeUserTemplates(5);
         openUserTab();
         tapItem(users(), 2);
-        QSignalSpy closeKeyboard(mPicker.get(), &TemplatePicker::signalCloseSoftwareKeyBoardForFileManager);
+        QSignalSpy closeKeyboard(m_picker.get(), &TemplatePicker::signalCloseSoftwareKeyBoardForFileManager);
         tap(button("deleteTemplateButton"));
         QCOMPARE(closeKeyboard.size(), 1);
-        QCOMPARE(mMessages.take(), (Reports{{43, "UserTemplate_003"}}));
+        QCOMPARE(m_messages.take(), (Reports{{43, "UserTemplate_003"}}));
         answer(MessageDefine::CLOSE_CANCEL);
         QCOMPARE(users()->count(), 5);
         answer(MessageDefine::CLOSE_OK); // to nobody's question
@@ -308,16 +308,16 @@ private Q_SLOTS:
 
         tap(button("deleteTemplateButton"));
         tap(button("deleteTemplateButton"));
-        QCOMPARE(mMessages.take().size(), 2);
+        QCOMPARE(m_messages.take().size(), 2);
         answer(MessageDefine::CLOSE_OK, 117); // another box
         QCOMPARE(users()->count(), 5);
         answer(MessageDefine::CLOSE_OK);
         QCOMPARE(names(users()), QStringList({"UserTemplate_001", "UserTemplate_002", "UserTemplate_004",
                                               "UserTemplate_005"}));
         verifyDense();
-        QVERIFY(!QFile::exists(mFixture.userRoot() + "/UserTemplate_003"));
-        QCOMPARE(mFixture.userOrder(), names(users()));
-        QCOMPARE(mReports.take(), (Reports{{5, "Titler"}}));
+        QVERIFY(!QFile::exists(m_fixture.userRoot() + "/UserTemplate_003"));
+        QCOMPARE(m_fixture.userOrder(), names(users()));
+        QCOMPARE(m_reports.take(), (Reports{{5, "Titler"}}));
         QVERIFY(!users()->selectedItem());
         QVERIFY(!button("selectUserButton")->isEnabled());
         QVERIFY(!button("deleteTemplateButton")->isEnabled());
@@ -329,7 +329,7 @@ private Q_SLOTS:
 
     void anAnswerAfterAnotherChoice()
     {
-        mFixture.makeUserTemplates(3);
+        m_fixture.makeUserTemplates(3);
         openUserTab();
         tapItem(users(), 0);
         tap(button("deleteTemplateButton"));
@@ -338,19 +338,19 @@ private Q_SLOTS:
         QCOMPARE(users()->count(), 3);
         // Asked about one that went meanwhile.
         tap(button("deleteTemplateButton"));
-        mPicker->slotDeleteUserTemplate(mFixture.userRoot() + "/UserTemplate_002/");
+        m_picker->slotDeleteUserTemplate(m_fixture.userRoot() + "/UserTemplate_002/");
         answer(MessageDefine::CLOSE_OK);
         QCOMPARE(names(users()), QStringList({"UserTemplate_001", "UserTemplate_003"}));
     }
 
     void aTemplateThatCannotBeDeletedStays()
     {
-        mFixture.makeUserTemplates(2);
+        m_fixture.makeUserTemplates(2);
         openUserTab();
         tapItem(users(), 1);
         tap(button("deleteTemplateButton"));
-        const QString folder = mFixture.userRoot() + "/UserTemplate_002";
-        const QString root = QDir::cleanPath(mFixture.titleRoot() + "/../..");
+        const QString folder = m_fixture.userRoot() + "/UserTemplate_002";
+        const QString root = QDir::cleanPath(m_fixture.titleRoot() + "/../..");
         QCOMPARE(::chmod(qPrintable(root), 0755), 0);
         QCOMPARE(::chmod(qPrintable(folder), 0555), 0);
         const int user = ::setfsuid(65534);
@@ -359,19 +359,19 @@ private Q_SLOTS:
         QCOMPARE(::chmod(qPrintable(folder), 0755), 0);
         QCOMPARE(users()->count(), 2);
         QVERIFY(users()->selectedItem());
-        QVERIFY(QFile::exists(mFixture.userTitle("UserTemplate_002")));
-        QVERIFY(mReports.take().isEmpty());
+        QVERIFY(QFile::exists(m_fixture.userTitle("UserTemplate_002")));
+        QVERIFY(m_reports.take().isEmpty());
     }
 
     void savedAsTemplate()
     {
-        mFixture.makeUserTemplates(3);
+        m_fixture.makeUserTemplates(3);
         openUserTab();
-        mFixture.makeUserTemplate("UserTemplate_004", {"saved"});
-        mPicker->slotSaveAsTemplate("UserTemplate_004");
+        m_fixture.makeUserTemplate("UserTemplate_004", {"saved"});
+        m_picker->slotSaveAsTemplate("UserTemplate_004");
         QCOMPARE(names(users()).last(), QString("UserTemplate_004"));
         QCOMPARE(users()->archive(3)->getOrder(), std::string("4"));
-        QCOMPARE(mFixture.userOrder().last(), QString("UserTemplate_004"));
+        QCOMPARE(m_fixture.userOrder().last(), QString("UserTemplate_004"));
         QCOMPARE(users()->item(3)->getIndex(), 3);
         // The new one is chosen, whichever was before, and remembered.
         QCOMPARE(users()->selectedItem(), users()->item(3));
@@ -380,85 +380,85 @@ private Q_SLOTS:
         QCOMPARE(textLines(preview()).first(), QString("saved"));
         QCOMPARE(fileName()->text(), QString("UserTemplate_004"));
         tapItem(users(), 1);
-        mFixture.makeUserTemplate("UserTemplate_005");
-        mPicker->slotSaveAsTemplate("UserTemplate_005");
+        m_fixture.makeUserTemplate("UserTemplate_005");
+        m_picker->slotSaveAsTemplate("UserTemplate_005");
         QVERIFY(!hasSelectedStyle(users()->item(1)));
         QCOMPARE(users()->selectedItem(), users()->item(4));
-        mPicker->reloadTemplates2();
+        m_picker->reloadTemplates2();
         QCOMPARE(TemplateTab::templateName(*users()->selectedArchive()), QString("UserTemplate_005"));
     }
 
     void imports()
     {
-        mFixture.makeUserTemplates(4);
+        m_fixture.makeUserTemplates(4);
         openUserTab();
-        mFixture.makeUserPictures("新 import");
-        mPicker->slotImportNewUserTemplate("新 import");
+        m_fixture.makeUserPictures("新 import");
+        m_picker->slotImportNewUserTemplate("新 import");
         QCOMPARE(names(users()).last(), QString("新 import"));
         QVERIFY(users()->archive(4)->text().empty());
-        QVERIFY(QFile::exists(mFixture.userTitle("新 import")));
+        QVERIFY(QFile::exists(m_fixture.userTitle("新 import")));
         QCOMPARE(users()->item(4)->geometry().topLeft() - users()->item(0)->pos(), QPoint(0, 153));
         // Over a name in use: the old one goes and the new one is the last.
         tapItem(users(), 1);
-        mFixture.makeUserPictures("UserTemplate_002");
-        mPicker->slotImportNewUserTemplate(mFixture.userRoot() + "/UserTemplate_002");
+        m_fixture.makeUserPictures("UserTemplate_002");
+        m_picker->slotImportNewUserTemplate(m_fixture.userRoot() + "/UserTemplate_002");
         QCOMPARE(names(users()), QStringList({"UserTemplate_001", "UserTemplate_003", "UserTemplate_004",
                                               "新 import", "UserTemplate_002"}));
-        QCOMPARE(mFixture.userOrder(), names(users()));
+        QCOMPARE(m_fixture.userOrder(), names(users()));
         QVERIFY(users()->archive(4)->text().empty());
         QVERIFY(!users()->selectedItem());
         QVERIFY(!button("deleteTemplateButton")->isEnabled());
         verifyDense();
         // Nothing to import.
         for (const char* name : {"gone", "", "..", "/"})
-            mPicker->slotImportNewUserTemplate(name);
+            m_picker->slotImportNewUserTemplate(name);
         QCOMPARE(users()->count(), 5);
-        QCOMPARE(mFixture.userOrder().size(), 5);
+        QCOMPARE(m_fixture.userOrder().size(), 5);
     }
 
     void renames()
     {
-        mFixture.makeUserTemplates(3);
+        m_fixture.makeUserTemplates(3);
         openUserTab();
         tapItem(users(), 1);
-        QVERIFY(QDir(mFixture.userRoot()).rename("UserTemplate_002", "片头"));
-        mPicker->slotRenameUserTemplate("UserTemplate_002", "片头", mFixture.userRoot() + "/片头/");
+        QVERIFY(QDir(m_fixture.userRoot()).rename("UserTemplate_002", "片头"));
+        m_picker->slotRenameUserTemplate("UserTemplate_002", "片头", m_fixture.userRoot() + "/片头/");
         QCOMPARE(names(users()), QStringList({"UserTemplate_001", "片头", "UserTemplate_003"}));
         QCOMPARE(fileName()->text(), QString("片头"));
-        QCOMPARE(users()->archive(1)->getPath(), mFixture.userTitle("片头").toStdString());
+        QCOMPARE(users()->archive(1)->getPath(), m_fixture.userTitle("片头").toStdString());
         QCOMPARE(users()->archive(1)->getName(), std::string("片头/Titler"));
-        QCOMPARE(mFixture.userOrder(), names(users()));
+        QCOMPARE(m_fixture.userOrder(), names(users()));
         UserTemplatePickerController controller;
-        QCOMPARE(controller.getLastSelectedTemplate(), mFixture.userTitle("片头").toStdString());
+        QCOMPARE(controller.getLastSelectedTemplate(), m_fixture.userTitle("片头").toStdString());
         // One that is not chosen, told with its title file.
-        QVERIFY(QDir(mFixture.userRoot()).rename("UserTemplate_001", "x"));
-        mPicker->slotRenameUserTemplate("UserTemplate_001", "x", mFixture.userTitle("x"));
-        QCOMPARE(users()->archive(0)->getPath(), mFixture.userTitle("x").toStdString());
+        QVERIFY(QDir(m_fixture.userRoot()).rename("UserTemplate_001", "x"));
+        m_picker->slotRenameUserTemplate("UserTemplate_001", "x", m_fixture.userTitle("x"));
+        QCOMPARE(users()->archive(0)->getPath(), m_fixture.userTitle("x").toStdString());
         QCOMPARE(fileName()->text(), QString("片头"));
-        const QStringList before = mFixture.userOrder();
-        mPicker->slotRenameUserTemplate("unknown", "y", mFixture.userRoot() + "/y/");
+        const QStringList before = m_fixture.userOrder();
+        m_picker->slotRenameUserTemplate("unknown", "y", m_fixture.userRoot() + "/y/");
         QCOMPARE(names(users()), before);
-        QCOMPARE(mFixture.userOrder(), before);
+        QCOMPARE(m_fixture.userOrder(), before);
     }
 
     void deletedOutside()
     {
-        mFixture.makeUserTemplates(5);
+        m_fixture.makeUserTemplates(5);
         openUserTab();
         tapItem(users(), 2);
-        QVERIFY(QDir(mFixture.userRoot() + "/UserTemplate_003").removeRecursively());
-        mPicker->slotDeleteUserTemplate(mFixture.userTitle("UserTemplate_003"));
+        QVERIFY(QDir(m_fixture.userRoot() + "/UserTemplate_003").removeRecursively());
+        m_picker->slotDeleteUserTemplate(m_fixture.userTitle("UserTemplate_003"));
         QCOMPARE(names(users()), QStringList({"UserTemplate_001", "UserTemplate_002", "UserTemplate_004",
                                               "UserTemplate_005"}));
         verifyDense();
         QVERIFY(!users()->selectedItem());
         QVERIFY(!button("selectUserButton")->isEnabled());
         QCOMPARE(fileName()->text(), QString());
-        QCOMPARE(mFixture.userOrder(), names(users()));
-        mPicker->slotDeleteUserTemplate(mFixture.userRoot() + "/unknown/");
-        mPicker->slotDeleteUserTemplate("");
+        QCOMPARE(m_fixture.userOrder(), names(users()));
+        m_picker->slotDeleteUserTemplate(m_fixture.userRoot() + "/unknown/");
+        m_picker->slotDeleteUserTemplate("");
         QCOMPARE(users()->count(), 4);
-        QVERIFY(mReports.take().isEmpty());
+        QVERIFY(m_reports.take().isEmpty());
         // The tap on what took the place of the gone one.
         tapItem(users(), 2);
         QCOMPARE(fileName()->text(), QString("UserTemplate_004"));
@@ -466,11 +466,11 @@ private Q_SLOTS:
 
     void deletedOutsideUnderTheFinger()
     {
-        mFixture.makeUserTemplates(3);
+        m_fixture.makeUserTemplates(3);
         openUserTab();
         const QPoint point = centre(users()->item(0));
         touch().press(0, point);
-        mPicker->slotDeleteUserTemplate(mFixture.userRoot() + "/UserTemplate_001/");
+        m_picker->slotDeleteUserTemplate(m_fixture.userRoot() + "/UserTemplate_001/");
         QCoreApplication::sendPostedEvents(nullptr, QEvent::DeferredDelete);
         touch().release(0, point);
         QVERIFY(!users()->selectedItem());
@@ -490,15 +490,15 @@ private Q_SLOTS:
     void theLastTemplateIsShown()
     {
         QFETCH(int, count);
-        mFixture.makeUserTemplates(count - 1);
+        m_fixture.makeUserTemplates(count - 1);
         makePicker();
         QScrollBar* bar = users()->scrollArea()->verticalScrollBar();
         // Hidden, as after the list has saved a template, and then while it is open.
         for (int round = 0; round < 2; ++round) {
             const QString name = QStringLiteral("saved %1").arg(round);
-            mFixture.makeUserTemplate(name);
-            mPicker->slotSaveAsTemplate(name);
-            mPicker->showUserTemplateTab();
+            m_fixture.makeUserTemplate(name);
+            m_picker->slotSaveAsTemplate(name);
+            m_picker->showUserTemplateTab();
             show();
             QVERIFY(users()->isVisible());
             TemplateItem* last = users()->item(users()->count() - 1);
@@ -508,10 +508,10 @@ private Q_SLOTS:
         }
         // Once: later rows do not move what the operator looks at.
         bar->setValue(0);
-        mFixture.makeUserTemplate("later 1");
+        m_fixture.makeUserTemplate("later 1");
         for (int i = 0; i < 4; ++i) {
-            mFixture.makeUserPictures(QStringLiteral("later %1").arg(i));
-            mPicker->slotImportNewUserTemplate(QStringLiteral("later %1").arg(i));
+            m_fixture.makeUserPictures(QStringLiteral("later %1").arg(i));
+            m_picker->slotImportNewUserTemplate(QStringLiteral("later %1").arg(i));
         }
         QCoreApplication::processEvents();
         QCOMPARE(bar->value(), 0);
@@ -519,7 +519,7 @@ private Q_SLOTS:
 
     void aDragScrollsAndTapsNothing()
     {
-        mFixture.makeUserTemplates(40);
+        m_fixture.makeUserTemplates(40);
         openUserTab();
         QScrollBar* bar = users()->scrollArea()->verticalScrollBar();
         bar->setValue(0);
@@ -545,14 +545,14 @@ private Q_SLOTS:
     void damagedPictures()
     {
         QFETCH(QString, kind);
-        mFixture.makePresets("templates_en", {"whole", "bad"});
-        const QString path = mFixture.presetRoot() + "/templates_en/bad_240.png";
+        m_fixture.makePresets("templates_en", {"whole", "bad"});
+        const QString path = m_fixture.presetRoot() + "/templates_en/bad_240.png";
         const QByteArray bytes = contents(path);
         QVERIFY(QFile::remove(path));
         if (kind == "none") {
             write(path, bytes);
             Archive archive;
-            archive.setPath((mFixture.presetRoot() + "/templates_en/bad.xml").toStdString());
+            archive.setPath((m_fixture.presetRoot() + "/templates_en/bad.xml").toStdString());
             QCOMPARE(ArchiveManager().saveArchive(&archive), 1);
         } else if (kind == "truncated") {
             write(path, bytes.left(bytes.size() / 3));
@@ -582,7 +582,7 @@ private Q_SLOTS:
 
     void framesOfTheItems()
     {
-        mFixture.makePresets("templates_en", {"a", "b"});
+        m_fixture.makePresets("templates_en", {"a", "b"});
         open();
         tapItem(presets(), 1);
         const QImage normal = presets()->item(0)->grab().toImage();
@@ -598,26 +598,26 @@ private Q_SLOTS:
     void masks()
     {
         open();
-        mPicker->showDialogMaskWidget(true);
-        QWidget* mask = mPicker->childAt(100, 100);
+        m_picker->showDialogMaskWidget(true);
+        QWidget* mask = m_picker->childAt(100, 100);
         QVERIFY(mask);
         QCOMPARE(mask->geometry(), QRect(10, 6, 1371 - 19, 833 - 18));
-        QVERIFY(!mPicker->testAttribute(Qt::WA_AcceptTouchEvents));
-        mPicker->showMessageMaskWidget(true);
-        mPicker->showMessageMaskWidget(false);
-        QVERIFY(!mPicker->testAttribute(Qt::WA_AcceptTouchEvents));
-        mPicker->showDialogMaskWidget(false);
-        QVERIFY(mPicker->testAttribute(Qt::WA_AcceptTouchEvents));
-        mPicker->showMessageMaskWidget(true);
-        QVERIFY(!mPicker->testAttribute(Qt::WA_AcceptTouchEvents));
-        mPicker->showMessageMaskWidget(false);
-        QVERIFY(mPicker->testAttribute(Qt::WA_AcceptTouchEvents));
+        QVERIFY(!m_picker->testAttribute(Qt::WA_AcceptTouchEvents));
+        m_picker->showMessageMaskWidget(true);
+        m_picker->showMessageMaskWidget(false);
+        QVERIFY(!m_picker->testAttribute(Qt::WA_AcceptTouchEvents));
+        m_picker->showDialogMaskWidget(false);
+        QVERIFY(m_picker->testAttribute(Qt::WA_AcceptTouchEvents));
+        m_picker->showMessageMaskWidget(true);
+        QVERIFY(!m_picker->testAttribute(Qt::WA_AcceptTouchEvents));
+        m_picker->showMessageMaskWidget(false);
+        QVERIFY(m_picker->testAttribute(Qt::WA_AcceptTouchEvents));
     }
 
     void menuOfAUserTemplate()
     {
-        mFixture.makeUserTemplates(1);
-        mFixture.makePresets("templates_en", {"a"});
+        m_fixture.makeUserTemplates(1);
+        m_fixture.makePresets("templates_en", {"a"});
         open();
         UserTemplateMenu menu;
         QStringList texts;
@@ -647,44 +647,44 @@ private Q_SLOTS:
     {
         QFETCH(bool, isReload);
         const TouchFixture fingers;
-        mFixture.makeUserTemplates(3);
+        m_fixture.makeUserTemplates(3);
         openUserTab();
         const QPoint place = centre(users()->item(1));
-        fingers.press(mPicker.get(), place);
+        fingers.press(m_picker.get(), place);
         QVERIFY(fingers.isLocked());
         if (isReload)
-            mPicker->reloadTemplates2();
+            m_picker->reloadTemplates2();
         else
-            mPicker->slotDeleteUserTemplate(mFixture.userRoot() + "/UserTemplate_002/");
+            m_picker->slotDeleteUserTemplate(m_fixture.userRoot() + "/UserTemplate_002/");
         QVERIFY(!fingers.isLocked());
-        fingers.lift(mPicker.get(), place);
+        fingers.lift(m_picker.get(), place);
         QVERIFY(!users()->selectedItem());
         QCoreApplication::processEvents();
-        fingers.tap(mPicker.get(), place);
+        fingers.tap(m_picker.get(), place);
         QCOMPARE(users()->selectedItem(), users()->item(1));
     }
 
     void manyTemplates()
     {
-        mFixture.makeUserTemplates(998);
+        m_fixture.makeUserTemplates(998);
         openUserTab();
         QCOMPARE(users()->count(), 998);
-        mPicker->showUserTemplateTab();
+        m_picker->showUserTemplateTab();
         tapItem(users(), 997);
         QCOMPARE(fileName()->text(), QString("UserTemplate_998"));
-        mPicker->slotDeleteUserTemplate(mFixture.userRoot() + "/UserTemplate_001/");
+        m_picker->slotDeleteUserTemplate(m_fixture.userRoot() + "/UserTemplate_001/");
         QCOMPARE(users()->item(0)->getIndex(), 0);
         QCOMPARE(users()->count(), 997);
         QCOMPARE(fileName()->text(), QString("UserTemplate_998"));
     }
 
 private:
-    void makePicker() { mPicker = std::make_unique<TemplatePicker>(); }
+    void makePicker() { m_picker = std::make_unique<TemplatePicker>(); }
 
     void show()
     {
-        mPicker->show();
-        QVERIFY(QTest::qWaitForWindowExposed(mPicker.get(), PATIENCE_MS));
+        m_picker->show();
+        QVERIFY(QTest::qWaitForWindowExposed(m_picker.get(), PATIENCE_MS));
     }
 
     void open()
@@ -696,15 +696,15 @@ private:
     void openUserTab()
     {
         open();
-        mPicker->showUserTemplateTab();
+        m_picker->showUserTemplateTab();
         QCoreApplication::processEvents();
     }
 
-    TemplateTab* presets() const { return mPicker->presetTab(); }
-    TemplateTab* users() const { return mPicker->userTab(); }
-    KSPushbutton* button(const char* name) const { return mPicker->findChild<KSPushbutton*>(name); }
-    QLabel* fileName() const { return mPicker->findChild<QLabel*>("fileName"); }
-    ArchiveItem* preview() const { return mPicker->findChild<ArchiveItem*>(); }
+    TemplateTab* presets() const { return m_picker->presetTab(); }
+    TemplateTab* users() const { return m_picker->userTab(); }
+    KSPushbutton* button(const char* name) const { return m_picker->findChild<KSPushbutton*>(name); }
+    QLabel* fileName() const { return m_picker->findChild<QLabel*>("fileName"); }
+    ArchiveItem* preview() const { return m_picker->findChild<ArchiveItem*>(); }
 
     static QStringList names(TemplateTab* tab)
     {
@@ -714,13 +714,13 @@ private:
         return result;
     }
 
-    QTest::QTouchEventWidgetSequence touch() { return QTest::touchEvent(mPicker.get(), mDevice); }
-    QPoint centre(QWidget* widget) const { return widget->mapTo(mPicker.get(), widget->rect().center()); }
+    QTest::QTouchEventWidgetSequence touch() { return QTest::touchEvent(m_picker.get(), m_device); }
+    QPoint centre(QWidget* widget) const { return widget->mapTo(m_picker.get(), widget->rect().center()); }
 
     void tap(QWidget* widget)
     {
         QVERIFY(widget->isVisible());
-        mDevice.tap(mPicker.get(), centre(widget));
+        m_device.tap(m_picker.get(), centre(widget));
     }
 
     void tapItem(TemplateTab* tab, int index)
@@ -732,7 +732,7 @@ private:
 
     void tapTab(int index)
     {
-        auto* tabs = mPicker->findChild<TitlerTabWidget*>();
+        auto* tabs = m_picker->findChild<TitlerTabWidget*>();
         QTest::mouseClick(tabs->tabBar(), Qt::LeftButton, Qt::NoModifier,
                           tabs->tabBar()->tabRect(index).center());
         QCOMPARE(tabs->currentIndex(), index);
@@ -740,7 +740,7 @@ private:
 
     void answer(MessageDefine::_emCloseType type, int id = 43)
     {
-        Q_EMIT mMessages.signalCloseMessage({1, type, id});
+        Q_EMIT m_messages.signalCloseMessage({1, type, id});
     }
 
     void verifyDense()
@@ -770,11 +770,11 @@ private:
             file.write(bytes);
     }
 
-    TemplateFixture mFixture;
-    FakeTitleChangeReporter mReports;
-    FakeMessageBoxController mMessages;
-    TouchDevice mDevice;
-    std::unique_ptr<TemplatePicker> mPicker;
+    TemplateFixture m_fixture;
+    FakeTitleChangeReporter m_reports;
+    FakeMessageBoxController m_messages;
+    TouchDevice m_device;
+    std::unique_ptr<TemplatePicker> m_picker;
 };
 
 QTEST_MAIN(tst_templatepicker)

@@ -38,7 +38,7 @@ class tst_templatepicker_notices : public QObject
 private Q_SLOTS:
     void initTestCase() { Q_INIT_RESOURCE(TitlerToolResource); }
     void init();
-    void cleanup() { mPicker.reset(); }
+    void cleanup() { m_picker.reset(); }
     void deletePaths_data();
     void deletePaths();
     void theFolderOfThePathGoesFirst();
@@ -57,7 +57,7 @@ private Q_SLOTS:
     void taps();
 
 private:
-    TemplateTab* users() const { return mPicker->userTab(); }
+    TemplateTab* users() const { return m_picker->userTab(); }
     QStringList names() const
     {
         QStringList result;
@@ -66,23 +66,23 @@ private:
         return result;
     }
     // "%1" stands for the root of the templates.
-    QString told(QString path) const { return path.replace(QLatin1String("%1"), mFixture.userRoot()); }
+    QString told(QString path) const { return path.replace(QLatin1String("%1"), m_fixture.userRoot()); }
 
-    TemplateFixture mFixture;
-    FakeTitleChangeReporter mReports;
-    FakeMessageBoxController mMessages;
-    LogFixture mLog;
-    std::unique_ptr<TemplatePicker> mPicker;
+    TemplateFixture m_fixture;
+    FakeTitleChangeReporter m_reports;
+    FakeMessageBoxController m_messages;
+    LogFixture m_log;
+    std::unique_ptr<TemplatePicker> m_picker;
 };
 
 void tst_templatepicker_notices::init()
 {
-    mFixture.resetTemplates();
-    mFixture.makeUserTemplates(3);
-    mPicker = std::make_unique<TemplatePicker>();
+    m_fixture.resetTemplates();
+    m_fixture.makeUserTemplates(3);
+    m_picker = std::make_unique<TemplatePicker>();
     systemLog.clear();
-    mLog.takeOperations();
-    mLog.takeDebugLines();
+    m_log.takeOperations();
+    m_log.takeDebugLines();
 }
 
 void tst_templatepicker_notices::deletePaths_data()
@@ -102,21 +102,21 @@ void tst_templatepicker_notices::deletePaths_data()
 void tst_templatepicker_notices::deletePaths()
 {
     QFETCH(QString, path);
-    QVERIFY(QDir(mFixture.userRoot() + "/UserTemplate_002").removeRecursively());
-    mPicker->slotDeleteUserTemplate(told(path));
+    QVERIFY(QDir(m_fixture.userRoot() + "/UserTemplate_002").removeRecursively());
+    m_picker->slotDeleteUserTemplate(told(path));
     QCOMPARE(names(), QStringList({"UserTemplate_001", "UserTemplate_003"}));
-    QCOMPARE(mFixture.userOrder(), names());
+    QCOMPARE(m_fixture.userOrder(), names());
     QVERIFY(systemLog.isEmpty());
 }
 
 void tst_templatepicker_notices::theFolderOfThePathGoesFirst()
 {
-    mFixture.makeUserTemplate("a.xml");
-    mPicker->slotSaveAsTemplate("a.xml");
-    QVERIFY(QDir(mFixture.userRoot() + "/a.xml").removeRecursively());
-    mPicker->slotDeleteUserTemplate(mFixture.userRoot() + "/a.xml");
+    m_fixture.makeUserTemplate("a.xml");
+    m_picker->slotSaveAsTemplate("a.xml");
+    QVERIFY(QDir(m_fixture.userRoot() + "/a.xml").removeRecursively());
+    m_picker->slotDeleteUserTemplate(m_fixture.userRoot() + "/a.xml");
     QCOMPARE(names(), QStringList({"UserTemplate_001", "UserTemplate_002", "UserTemplate_003"}));
-    QCOMPARE(mFixture.userOrder(), names());
+    QCOMPARE(m_fixture.userOrder(), names());
 }
 
 void tst_templatepicker_notices::unknownDelete_data()
@@ -138,12 +138,12 @@ void tst_templatepicker_notices::unknownDelete()
     QFETCH(QString, path);
     QFETCH(QString, name);
     const QStringList before = names();
-    mPicker->slotDeleteUserTemplate(told(path));
+    m_picker->slotDeleteUserTemplate(told(path));
     QCOMPARE(systemLog,
              QStringList(QStringLiteral("4 TemplatePicker 400: slotDeleteUserTemplate() \"") + name +
                          QLatin1Char('(') + told(path) + QStringLiteral(")\" is not found.")));
     QCOMPARE(names(), before);
-    QCOMPARE(mFixture.userOrder(), before);
+    QCOMPARE(m_fixture.userOrder(), before);
 }
 
 void tst_templatepicker_notices::renamePaths_data()
@@ -171,15 +171,15 @@ void tst_templatepicker_notices::renamePaths()
     QFETCH(QString, name);
     QFETCH(QString, path);
     users()->item(1)->clickTriggered();
-    QVERIFY(QDir(mFixture.userRoot()).rename("UserTemplate_002", name));
-    mPicker->slotRenameUserTemplate("UserTemplate_002", name, told(path));
+    QVERIFY(QDir(m_fixture.userRoot()).rename("UserTemplate_002", name));
+    m_picker->slotRenameUserTemplate("UserTemplate_002", name, told(path));
     QCOMPARE(names(), QStringList({"UserTemplate_001", name, "UserTemplate_003"}));
-    QCOMPARE(QString::fromStdString(users()->archive(1)->getPath()), mFixture.userTitle(name));
-    QCOMPARE(mFixture.userOrder(), names());
+    QCOMPARE(QString::fromStdString(users()->archive(1)->getPath()), m_fixture.userTitle(name));
+    QCOMPARE(m_fixture.userOrder(), names());
     QCOMPARE(QString::fromStdString(UserTemplatePickerController().getLastSelectedTemplate()),
-             mFixture.userTitle(name));
+             m_fixture.userTitle(name));
     QCOMPARE(
-        mLog.takeDebugLines(),
+        m_log.takeDebugLines(),
         QStringList(QStringLiteral("[TemplatePicker] 200: slotRenameUserTemplate() UserTemplate_002 -> ") +
                     name));
     QVERIFY(systemLog.isEmpty());
@@ -188,13 +188,13 @@ void tst_templatepicker_notices::renamePaths()
 void tst_templatepicker_notices::unknownRename()
 {
     const QStringList before = names();
-    mPicker->slotRenameUserTemplate("nobody", "片头", told("%1/片头/"));
+    m_picker->slotRenameUserTemplate("nobody", "片头", told("%1/片头/"));
     QCOMPARE(systemLog, QStringList("4 TemplatePicker 400: slotRenameUserTemplate() \"nobody\" is not found. "
                                     "cannot rename to \"片头\"."));
-    QCOMPARE(mLog.takeDebugLines(),
+    QCOMPARE(m_log.takeDebugLines(),
              QStringList("[TemplatePicker] 200: slotRenameUserTemplate() nobody -> 片头"));
     QCOMPARE(names(), before);
-    QCOMPARE(mFixture.userOrder(), before);
+    QCOMPARE(m_fixture.userOrder(), before);
 }
 
 void tst_templatepicker_notices::importPaths_data()
@@ -210,10 +210,10 @@ void tst_templatepicker_notices::importPaths_data()
 void tst_templatepicker_notices::importPaths()
 {
     QFETCH(QString, path);
-    mFixture.makeUserPictures("new one");
-    mPicker->slotImportNewUserTemplate(told(path));
+    m_fixture.makeUserPictures("new one");
+    m_picker->slotImportNewUserTemplate(told(path));
     QCOMPARE(names(), QStringList({"UserTemplate_001", "UserTemplate_002", "UserTemplate_003", "new one"}));
-    QCOMPARE(mFixture.userOrder(), names());
+    QCOMPARE(m_fixture.userOrder(), names());
 }
 
 void tst_templatepicker_notices::importOfAFolderThatIsNotThere_data()
@@ -228,15 +228,15 @@ void tst_templatepicker_notices::importOfAFolderThatIsNotThere()
 {
     QFETCH(QString, path);
     // The files' times tell another order than the tiles.
-    mFixture.makeUserTemplate("UserTemplate_001");
-    QVERIFY(QDir(mFixture.userRoot() + "/UserTemplate_002").removeRecursively());
+    m_fixture.makeUserTemplate("UserTemplate_001");
+    QVERIFY(QDir(m_fixture.userRoot() + "/UserTemplate_002").removeRecursively());
     users()->item(1)->clickTriggered();
-    mPicker->slotImportNewUserTemplate(told(path));
+    m_picker->slotImportNewUserTemplate(told(path));
     QCOMPARE(names(), QStringList({"UserTemplate_001", "UserTemplate_003"}));
-    QCOMPARE(mFixture.userOrder(), names());
+    QCOMPARE(m_fixture.userOrder(), names());
     QVERIFY(!users()->selectedItem());
     // And a reading of what is on disk tells no other.
-    mPicker->reloadTemplates2();
+    m_picker->reloadTemplates2();
     QCOMPARE(names(), QStringList({"UserTemplate_001", "UserTemplate_003"}));
 }
 
@@ -253,35 +253,35 @@ void tst_templatepicker_notices::pathsOutsideChangeNothing_data()
 void tst_templatepicker_notices::pathsOutsideChangeNothing()
 {
     QFETCH(QString, folder);
-    const QString data = QFileInfo(QFileInfo(mFixture.userRoot()).path()).path();
+    const QString data = QFileInfo(QFileInfo(m_fixture.userRoot()).path()).path();
     folder.replace("%2", data);
     folder = told(folder);
     QVERIFY(QDir().mkpath(data + "/elsewhere"));
-    QFile::remove(mFixture.userRoot() + "/link");
-    QVERIFY(QFile::link(data + "/elsewhere", mFixture.userRoot() + "/link"));
+    QFile::remove(m_fixture.userRoot() + "/link");
+    QVERIFY(QFile::link(data + "/elsewhere", m_fixture.userRoot() + "/link"));
     QVERIFY(QDir().mkpath(folder));
     for (const char* file : {"/Titler.xml", "/Titler_240.png"})
         QVERIFY(QFile::exists(folder + file) ||
-                QFile::copy(mFixture.userRoot() + "/UserTemplate_003" + file, folder + file));
+                QFile::copy(m_fixture.userRoot() + "/UserTemplate_003" + file, folder + file));
     const QStringList before = names();
     const QString path = users()->archive(1)->getPath().c_str();
     const auto isUnchanged = [&] {
-        return names() == before && mFixture.userOrder() == before &&
+        return names() == before && m_fixture.userOrder() == before &&
                users()->archive(1)->getPath().c_str() == path && QFile::exists(path) &&
                QFile::exists(folder + "/Titler.xml") && QFile::exists(folder + "/Titler_240.png");
     };
-    mLog.takeDebugLines();
+    m_log.takeDebugLines();
     for (const QString& notice : {folder, folder + "/", folder + "/Titler.xml"}) {
-        mPicker->slotDeleteUserTemplate(notice);
+        m_picker->slotDeleteUserTemplate(notice);
         QVERIFY2(isUnchanged(), qPrintable("delete " + notice));
-        QCOMPARE(systemLog.size() + mLog.takeDebugLines().size(), 1);
+        QCOMPARE(systemLog.size() + m_log.takeDebugLines().size(), 1);
         systemLog.clear();
-        mPicker->slotImportNewUserTemplate(notice);
+        m_picker->slotImportNewUserTemplate(notice);
         QVERIFY2(isUnchanged(), qPrintable("import " + notice));
-        QCOMPARE(mLog.takeDebugLines("ConfinedPath").size(), 1);
-        mPicker->slotRenameUserTemplate("UserTemplate_002", "after", notice);
+        QCOMPARE(m_log.takeDebugLines("ConfinedPath").size(), 1);
+        m_picker->slotRenameUserTemplate("UserTemplate_002", "after", notice);
         QVERIFY2(isUnchanged(), qPrintable("rename " + notice));
-        QCOMPARE(mLog.takeDebugLines("ConfinedPath").size(), 1);
+        QCOMPARE(m_log.takeDebugLines("ConfinedPath").size(), 1);
     }
     QVERIFY(systemLog.isEmpty());
     // A record that leads outside all the same deletes nothing there.
@@ -291,18 +291,19 @@ void tst_templatepicker_notices::pathsOutsideChangeNothing()
 
 void tst_templatepicker_notices::foldersThatAreLinksElsewhere()
 {
-    const QString elsewhere = QFileInfo(QFileInfo(mFixture.userRoot()).path()).path() + "/elsewhere template";
-    QVERIFY(QDir(mFixture.userRoot()).rename("UserTemplate_003", elsewhere));
-    QVERIFY(QFile::link(elsewhere, mFixture.userRoot() + "/UserTemplate_003"));
+    const QString elsewhere =
+        QFileInfo(QFileInfo(m_fixture.userRoot()).path()).path() + "/elsewhere template";
+    QVERIFY(QDir(m_fixture.userRoot()).rename("UserTemplate_003", elsewhere));
+    QVERIFY(QFile::link(elsewhere, m_fixture.userRoot() + "/UserTemplate_003"));
     const QStringList before = names();
     QVERIFY(QFile::remove(elsewhere + "/Titler.xml"));
-    mPicker->slotImportNewUserTemplate("UserTemplate_003");
+    m_picker->slotImportNewUserTemplate("UserTemplate_003");
     QCOMPARE(names(), before);
     QVERIFY(!QFile::exists(elsewhere + "/Titler.xml"));
     // The next reading leaves it out.
-    QVERIFY(QFile::copy(mFixture.userTitle("UserTemplate_001"), elsewhere + "/Titler.xml"));
+    QVERIFY(QFile::copy(m_fixture.userTitle("UserTemplate_001"), elsewhere + "/Titler.xml"));
     UserTemplateManager::getInstance()->reCreateNewOrderXml();
-    QCOMPARE(mFixture.userOrder(), QStringList({"UserTemplate_001", "UserTemplate_002"}));
+    QCOMPARE(m_fixture.userOrder(), QStringList({"UserTemplate_001", "UserTemplate_002"}));
     Archive archive;
     QCOMPARE(UserTemplateManager::getInstance()->createNewTemplateXml("UserTemplate_003", &archive), 0);
     QCOMPARE(UserTemplateManager::getInstance()->loadTemplate("UserTemplate_003", &archive), 0);
@@ -311,24 +312,24 @@ void tst_templatepicker_notices::foldersThatAreLinksElsewhere()
 
 void tst_templatepicker_notices::taps()
 {
-    mFixture.makePresets("templates_en", {"a", "b"});
-    mPicker = std::make_unique<TemplatePicker>();
-    mPicker->show();
-    QVERIFY(QTest::qWaitForWindowExposed(mPicker.get(), PATIENCE_MS));
-    mLog.takeOperations();
-    mPicker->presetTab()->item(1)->clickTriggered();
-    mPicker->showUserTemplateTab();
+    m_fixture.makePresets("templates_en", {"a", "b"});
+    m_picker = std::make_unique<TemplatePicker>();
+    m_picker->show();
+    QVERIFY(QTest::qWaitForWindowExposed(m_picker.get(), PATIENCE_MS));
+    m_log.takeOperations();
+    m_picker->presetTab()->item(1)->clickTriggered();
+    m_picker->showUserTemplateTab();
     users()->item(2)->clickTriggered();
-    QCOMPARE(mLog.takeOperations(), QStringList({"[Template Area] 200: Select the 1 thumnail",
-                                                 "[Template Area] 200: Select the 2 thumnail"}));
-    QTest::mouseClick(mPicker->findChild<KSPushbutton*>("cancelTemplateButton"), Qt::LeftButton);
-    QVERIFY(!mPicker->isVisible());
-    QCOMPARE(mPicker->result(), int(QDialog::Rejected));
-    QCOMPARE(mLog.takeOperations(), QStringList("[Template Area] 200: Tap Cancel Button"));
+    QCOMPARE(m_log.takeOperations(), QStringList({"[Template Area] 200: Select the 1 thumnail",
+                                                  "[Template Area] 200: Select the 2 thumnail"}));
+    QTest::mouseClick(m_picker->findChild<KSPushbutton*>("cancelTemplateButton"), Qt::LeftButton);
+    QVERIFY(!m_picker->isVisible());
+    QCOMPARE(m_picker->result(), int(QDialog::Rejected));
+    QCOMPARE(m_log.takeOperations(), QStringList("[Template Area] 200: Tap Cancel Button"));
     // Closed otherwise, nobody tapped.
-    mPicker->show();
-    mPicker->reject();
-    QVERIFY(mLog.takeOperations().isEmpty());
+    m_picker->show();
+    m_picker->reject();
+    QVERIFY(m_log.takeOperations().isEmpty());
 }
 
 QTEST_MAIN(tst_templatepicker_notices)

@@ -27,36 +27,36 @@ class tst_templatescrollarea : public QObject
 private Q_SLOTS:
     void init()
     {
-        mArea = std::make_unique<TemplateScrollArea>();
+        m_area = std::make_unique<TemplateScrollArea>();
         auto* board = new QWidget;
         auto* grid = new QGridLayout(board);
         grid->setContentsMargins(0, 0, 0, 0);
         grid->setSpacing(0);
         grid->setSizeConstraint(QLayout::SetFixedSize);
-        mButtons.clear();
+        m_buttons.clear();
         for (int i = 0; i < COLUMNS * ROWS; ++i) {
             auto* button = new QPushButton;
             button->setFixedSize(BUTTON);
             button->setAttribute(Qt::WA_AcceptTouchEvents);
-            button->installEventFilter(mArea.get());
+            button->installEventFilter(m_area.get());
             grid->addWidget(button, i / COLUMNS, i % COLUMNS);
-            mButtons.append(button);
+            m_buttons.append(button);
         }
-        mArea->setWidget(board);
-        mArea->setFixedSize(460, 400);
-        mArea->initTouch();
-        mArea->show();
-        QVERIFY(QTest::qWaitForWindowExposed(mArea.get(), PATIENCE_MS));
-        QCOMPARE(mArea->verticalScrollBar()->maximum(), ROWS * BUTTON.height() - 400);
-        mPressed = std::make_unique<QSignalSpy>(mArea.get(), &TemplateScrollArea::itemPressed);
+        m_area->setWidget(board);
+        m_area->setFixedSize(460, 400);
+        m_area->initTouch();
+        m_area->show();
+        QVERIFY(QTest::qWaitForWindowExposed(m_area.get(), PATIENCE_MS));
+        QCOMPARE(m_area->verticalScrollBar()->maximum(), ROWS * BUTTON.height() - 400);
+        m_pressed = std::make_unique<QSignalSpy>(m_area.get(), &TemplateScrollArea::itemPressed);
     }
 
     void aTap()
     {
         touch().press(0, QPoint(150, 100));
         touch().release(0, QPoint(150, 100));
-        QCOMPARE(mPressed->size(), 1);
-        QCOMPARE(pressed(0), mButtons[5]);
+        QCOMPARE(m_pressed->size(), 1);
+        QCOMPARE(pressed(0), m_buttons[5]);
         QCOMPARE(value(), 0);
     }
 
@@ -64,7 +64,7 @@ private Q_SLOTS:
     {
         touch().press(0, QPoint(430, 100));
         touch().release(0, QPoint(430, 100));
-        QVERIFY(mPressed->isEmpty());
+        QVERIFY(m_pressed->isEmpty());
     }
 
     void farAsATapMayStray_data()
@@ -86,12 +86,12 @@ private Q_SLOTS:
         touch().move(0, start + way);
         touch().move(0, start);
         touch().release(0, start);
-        QCOMPARE(mPressed->size(), isTap ? 1 : 0);
+        QCOMPARE(m_pressed->size(), isTap ? 1 : 0);
         // The same with no update between.
-        mArea->stopFlick();
+        m_area->stopFlick();
         touch().press(0, start);
         touch().release(0, start + way);
-        QCOMPARE(mPressed->size(), isTap ? 2 : 0);
+        QCOMPARE(m_pressed->size(), isTap ? 2 : 0);
     }
 
     void aDragFollowsTheFinger()
@@ -100,29 +100,29 @@ private Q_SLOTS:
         touch().move(0, QPoint(150, 298)); // where the drag starts
         touch().move(0, QPoint(150, 98));
         QTRY_VERIFY(value() >= 190);
-        QTRY_VERIFY(mArea->isFlickEnd());
+        QTRY_VERIFY(m_area->isFlickEnd());
         QVERIFY(value() <= 200);
         // Back to where it came from, held still, and lifted: no flick.
         touch().move(0, QPoint(150, 298));
         QTRY_VERIFY(value() <= 10);
-        QTRY_VERIFY(mArea->isFlickEnd());
+        QTRY_VERIFY(m_area->isFlickEnd());
         touch().release(0, QPoint(150, 298));
         const int rest = value();
         QTest::qWait(3 * TemplateScrollArea::TOUCH_TIMER_TIME);
         QCOMPARE(value(), rest);
-        QVERIFY(mPressed->isEmpty());
+        QVERIFY(m_pressed->isEmpty());
     }
 
     void aFlickRunsOnAndDiesAtTheEnd()
     {
-        mArea->verticalScrollBar()->setValue(mArea->verticalScrollBar()->maximum() - 60);
+        m_area->verticalScrollBar()->setValue(m_area->verticalScrollBar()->maximum() - 60);
         flickUp();
-        QTRY_COMPARE(value(), mArea->verticalScrollBar()->maximum());
+        QTRY_COMPARE(value(), m_area->verticalScrollBar()->maximum());
         QTest::qWait(3 * TemplateScrollArea::TOUCH_TIMER_TIME);
-        QCOMPARE(value(), mArea->verticalScrollBar()->maximum());
+        QCOMPARE(value(), m_area->verticalScrollBar()->maximum());
         // The grid is not in flight any more: the next finger taps.
         tap(QPoint(150, 100));
-        QCOMPARE(mPressed->size(), 1);
+        QCOMPARE(m_pressed->size(), 1);
     }
 
     void aFlickComesToRest()
@@ -134,8 +134,8 @@ private Q_SLOTS:
         QTRY_VERIFY(value() > 0);
         const int after = value();
         QTRY_VERIFY(value() > after);
-        QTRY_VERIFY(mArea->isFlickEnd());
-        QVERIFY(value() < mArea->verticalScrollBar()->maximum());
+        QTRY_VERIFY(m_area->isFlickEnd());
+        QVERIFY(value() < m_area->verticalScrollBar()->maximum());
     }
 
     void aFingerThatStopsAFlickTapsNothing()
@@ -147,9 +147,9 @@ private Q_SLOTS:
         touch().release(0, QPoint(150, 100));
         QTest::qWait(3 * TemplateScrollArea::TOUCH_TIMER_TIME);
         QCOMPARE(value(), braked);
-        QVERIFY(mPressed->isEmpty());
+        QVERIFY(m_pressed->isEmpty());
         tap(QPoint(150, 100));
-        QCOMPARE(mPressed->size(), 1);
+        QCOMPARE(m_pressed->size(), 1);
     }
 
     void aSecondFingerDoesNothing()
@@ -161,10 +161,10 @@ private Q_SLOTS:
         QTest::qWait(3 * TemplateScrollArea::TOUCH_TIMER_TIME);
         QCOMPARE(value(), 0);
         touch().move(0, QPoint(150, 300)).release(1, QPoint(250, 100));
-        QVERIFY(mPressed->isEmpty());
+        QVERIFY(m_pressed->isEmpty());
         touch().release(0, QPoint(150, 300));
-        QCOMPARE(mPressed->size(), 1);
-        QCOMPARE(pressed(0), mButtons[3 * COLUMNS + 1]);
+        QCOMPARE(m_pressed->size(), 1);
+        QCOMPARE(pressed(0), m_buttons[3 * COLUMNS + 1]);
     }
 
     // The first finger lifts while a second one on the same button stays.
@@ -173,61 +173,61 @@ private Q_SLOTS:
         touch().press(0, QPoint(150, 100));
         touch().move(0, QPoint(150, 100)).press(1, QPoint(160, 100));
         touch().release(0, QPoint(150, 100)).move(1, QPoint(160, 100));
-        QCOMPARE(mPressed->size(), 1);
+        QCOMPARE(m_pressed->size(), 1);
         touch().move(1, QPoint(160, 10));
         touch().release(1, QPoint(160, 10));
-        QCOMPARE(mPressed->size(), 1);
+        QCOMPARE(m_pressed->size(), 1);
         QCOMPARE(value(), 0);
         tap(QPoint(150, 100));
-        QCOMPARE(mPressed->size(), 2);
+        QCOMPARE(m_pressed->size(), 2);
     }
 
     void aCancelledTouchTapsNothing()
     {
         touch().press(0, QPoint(150, 100));
-        QTouchEvent cancel(QEvent::TouchCancel, mDevice);
-        QCoreApplication::sendEvent(mButtons[5], &cancel);
+        QTouchEvent cancel(QEvent::TouchCancel, m_device);
+        QCoreApplication::sendEvent(m_buttons[5], &cancel);
         touch().release(0, QPoint(150, 100));
-        QVERIFY(mPressed->isEmpty());
+        QVERIFY(m_pressed->isEmpty());
         tap(QPoint(150, 100));
-        QCOMPARE(mPressed->size(), 1);
+        QCOMPARE(m_pressed->size(), 1);
     }
 
     // As when a dialog took it.
     void aTouchAfterOneWithoutAnEnd()
     {
         touch().press(0, QPoint(150, 100));
-        QTouchEvent again(QEvent::TouchBegin, mDevice, Qt::NoModifier,
+        QTouchEvent again(QEvent::TouchBegin, m_device, Qt::NoModifier,
                           {QEventPoint(1, QEventPoint::Pressed, QPointF(30, 30),
-                                       mButtons[5]->mapToGlobal(QPointF(30, 30)))});
-        QCoreApplication::sendEvent(mButtons[5], &again);
-        QTouchEvent end(QEvent::TouchEnd, mDevice, Qt::NoModifier,
+                                       m_buttons[5]->mapToGlobal(QPointF(30, 30)))});
+        QCoreApplication::sendEvent(m_buttons[5], &again);
+        QTouchEvent end(QEvent::TouchEnd, m_device, Qt::NoModifier,
                         {QEventPoint(1, QEventPoint::Released, QPointF(30, 30),
-                                     mButtons[5]->mapToGlobal(QPointF(30, 30)))});
-        QCoreApplication::sendEvent(mButtons[5], &end);
-        QCOMPARE(mPressed->size(), 1);
-        QCOMPARE(pressed(0), mButtons[5]);
+                                     m_buttons[5]->mapToGlobal(QPointF(30, 30)))});
+        QCoreApplication::sendEvent(m_buttons[5], &end);
+        QCOMPARE(m_pressed->size(), 1);
+        QCOMPARE(pressed(0), m_buttons[5]);
         touch().release(0, QPoint(150, 100));
-        QCOMPARE(mPressed->size(), 1);
+        QCOMPARE(m_pressed->size(), 1);
     }
 
     // Its end never comes then.
     void theTouchedButtonGoes()
     {
         touch().press(0, QPoint(150, 100));
-        delete mButtons[5];
+        delete m_buttons[5];
         touch().release(0, QPoint(150, 100));
-        QVERIFY(mPressed->isEmpty());
+        QVERIFY(m_pressed->isEmpty());
         tap(QPoint(50, 100));
-        QCOMPARE(mPressed->size(), 1);
-        QCOMPARE(pressed(0), mButtons[4]);
+        QCOMPARE(m_pressed->size(), 1);
+        QCOMPARE(pressed(0), m_buttons[4]);
     }
 
     void hidingEndsTheMotion()
     {
         flickUp();
         QTRY_VERIFY(value() > 0);
-        mArea->hide();
+        m_area->hide();
         const int hidden = value();
         QTest::qWait(3 * TemplateScrollArea::TOUCH_TIMER_TIME);
         QCOMPARE(value(), hidden);
@@ -238,9 +238,9 @@ private Q_SLOTS:
         flickUp();
         QTRY_VERIFY(value() > 0);
         const int before = value();
-        QWheelEvent wheel(QPointF(5, 5), mArea->verticalScrollBar()->mapToGlobal(QPointF(5, 5)), QPoint(),
+        QWheelEvent wheel(QPointF(5, 5), m_area->verticalScrollBar()->mapToGlobal(QPointF(5, 5)), QPoint(),
                           QPoint(0, 120), Qt::NoButton, Qt::NoModifier, Qt::NoScrollPhase, false);
-        QCoreApplication::sendEvent(mArea->verticalScrollBar(), &wheel);
+        QCoreApplication::sendEvent(m_area->verticalScrollBar(), &wheel);
         QVERIFY(value() < before);
         const int after = value();
         QTest::qWait(3 * TemplateScrollArea::TOUCH_TIMER_TIME);
@@ -249,18 +249,18 @@ private Q_SLOTS:
 
     void aGridThatFitsDoesNotMove()
     {
-        for (int i = 2 * COLUMNS; i < mButtons.size(); ++i)
-            delete mButtons[i];
-        QTRY_COMPARE(mArea->verticalScrollBar()->maximum(), 0);
+        for (int i = 2 * COLUMNS; i < m_buttons.size(); ++i)
+            delete m_buttons[i];
+        QTRY_COMPARE(m_area->verticalScrollBar()->maximum(), 0);
         flickUp();
         QTest::qWait(3 * TemplateScrollArea::TOUCH_TIMER_TIME);
         QCOMPARE(value(), 0);
         tap(QPoint(150, 100));
-        QCOMPARE(mPressed->size(), 1);
+        QCOMPARE(m_pressed->size(), 1);
     }
 
 private:
-    QTest::QTouchEventWidgetSequence touch() { return QTest::touchEvent(mArea.get(), mDevice); }
+    QTest::QTouchEventWidgetSequence touch() { return QTest::touchEvent(m_area.get(), m_device); }
 
     void tap(const QPoint& point)
     {
@@ -276,13 +276,13 @@ private:
         touch().release(0, QPoint(150, 60));
     }
 
-    QPushButton* pressed(int index) const { return mPressed->at(index).at(0).value<QPushButton*>(); }
-    int value() const { return mArea->verticalScrollBar()->value(); }
+    QPushButton* pressed(int index) const { return m_pressed->at(index).at(0).value<QPushButton*>(); }
+    int value() const { return m_area->verticalScrollBar()->value(); }
 
-    TouchDevice mDevice;
-    std::unique_ptr<TemplateScrollArea> mArea;
-    std::unique_ptr<QSignalSpy> mPressed;
-    QList<QPushButton*> mButtons;
+    TouchDevice m_device;
+    std::unique_ptr<TemplateScrollArea> m_area;
+    std::unique_ptr<QSignalSpy> m_pressed;
+    QList<QPushButton*> m_buttons;
 };
 
 QTEST_MAIN(tst_templatescrollarea)

@@ -82,7 +82,7 @@ private:
         QVERIFY(image.save(path));
     }
 
-    LibraryFixture mFixture;
+    LibraryFixture m_fixture;
 };
 
 void tst_thumbnailrender::nullDoesNothing()
@@ -97,7 +97,7 @@ void tst_thumbnailrender::nullDoesNothing()
 
 void tst_thumbnailrender::fastStageTouchesNoDisk()
 {
-    const QString folder = mFixture.makeFolder(QStringLiteral("fast"));
+    const QString folder = m_fixture.makeFolder(QStringLiteral("fast"));
     const auto archive = LibraryFixture::makeRecord(folder, QStringLiteral("t"), QStringLiteral("Fast"));
     ThumbnailRender render;
     QSignalSpy spy(&render, &IThumbnailRender::saveHalfThumbnailsOK);
@@ -111,7 +111,7 @@ void tst_thumbnailrender::fastStageTouchesNoDisk()
 
 void tst_thumbnailrender::fastStageWithoutBackgroundIsTransparent()
 {
-    const auto archive = LibraryFixture::makeRecord(mFixture.makeFolder(QStringLiteral("bare")),
+    const auto archive = LibraryFixture::makeRecord(m_fixture.makeFolder(QStringLiteral("bare")),
                                                     QStringLiteral("t"), QStringLiteral("Bare"));
     ThumbnailRender render;
     const QImage picture = fastPicture(render, *archive);
@@ -123,7 +123,7 @@ void tst_thumbnailrender::fastStageWithoutBackgroundIsTransparent()
 
 void tst_thumbnailrender::fastStageScalesTheBackground()
 {
-    const QString folder = mFixture.makeFolder(QStringLiteral("background"));
+    const QString folder = m_fixture.makeFolder(QStringLiteral("background"));
     const auto archive = LibraryFixture::makeRecord(folder, QStringLiteral("t"), QString());
     archive->setBgResource("bg.png");
     paint(folder + QStringLiteral("/bg.png"), QSize(100, 100), Qt::blue);
@@ -140,7 +140,7 @@ void tst_thumbnailrender::fastStageScalesTheBackground()
 
 void tst_thumbnailrender::fastStageLogsWhereTheTextsAre()
 {
-    const auto archive = LibraryFixture::makeRecord(mFixture.makeFolder(QStringLiteral("logged")),
+    const auto archive = LibraryFixture::makeRecord(m_fixture.makeFolder(QStringLiteral("logged")),
                                                     QStringLiteral("t"), QString());
     archive->setText({LibraryFixture::makeText(QStringLiteral("one"), 1),
                       LibraryFixture::makeText(QStringLiteral("longer"), 3)});
@@ -169,7 +169,7 @@ void tst_thumbnailrender::fastStageLogsWhereTheTextsAre()
 // Black and, other than that of the canvas and the large pictures, opaque.
 void tst_thumbnailrender::shadowOfTheFastStage()
 {
-    const auto archive = LibraryFixture::makeRecord(mFixture.makeFolder(QStringLiteral("shadow")),
+    const auto archive = LibraryFixture::makeRecord(m_fixture.makeFolder(QStringLiteral("shadow")),
                                                     QStringLiteral("t"), QString());
     TText* text = LibraryFixture::makeText(QStringLiteral("█████\n█████\n█████"), 1, 0, 0);
     for (TextStyle* style : text->getTextItems()) {
@@ -204,7 +204,7 @@ void tst_thumbnailrender::shadowOfTheFastStage()
 
 void tst_thumbnailrender::missingBackgroundIsPassedOver()
 {
-    const QString folder = mFixture.makeFolder(QStringLiteral("missing"));
+    const QString folder = m_fixture.makeFolder(QStringLiteral("missing"));
     const auto archive = LibraryFixture::makeRecord(folder, QStringLiteral("t"), QString());
     archive->setBgResource("nothing.png");
     archive->setBgResourceBig("nothing.png");
@@ -221,7 +221,7 @@ void tst_thumbnailrender::missingBackgroundIsPassedOver()
 
 void tst_thumbnailrender::hugeBackgroundGivesPicturesOfTheUsualSize()
 {
-    const QString folder = mFixture.makeFolder(QStringLiteral("huge"));
+    const QString folder = m_fixture.makeFolder(QStringLiteral("huge"));
     const auto archive = LibraryFixture::makeRecord(folder, QStringLiteral("t"), QStringLiteral("Huge"));
     archive->setBgResource("bg.png");
     archive->setBgResourceBig("bg.png");
@@ -241,7 +241,7 @@ void tst_thumbnailrender::hugeBackgroundGivesPicturesOfTheUsualSize()
 void tst_thumbnailrender::slowStageWritesFourFiles()
 {
     FakeTitleChangeReporter reports;
-    const QString folder = mFixture.makeFolder(QStringLiteral("slow"));
+    const QString folder = m_fixture.makeFolder(QStringLiteral("slow"));
     const auto archive = LibraryFixture::makeRecord(folder, QStringLiteral("t"), QStringLiteral("Slow"));
     archive->setBgResource("bg.png");
     archive->setBgResourceBig("bg.png");
@@ -263,7 +263,7 @@ void tst_thumbnailrender::slowStageWritesFourFiles()
 
 void tst_thumbnailrender::slowStageReplacesTheOldBigPicture()
 {
-    const QString folder = mFixture.makeFolder(QStringLiteral("old"));
+    const QString folder = m_fixture.makeFolder(QStringLiteral("old"));
     const auto archive = LibraryFixture::makeRecord(folder, QStringLiteral("t"), QString());
     const QString picture = folder + QStringLiteral("/t_1920.png");
     paint(picture, QSize(10, 10), Qt::red);
@@ -282,7 +282,7 @@ void tst_thumbnailrender::slowStageReplacesNothingElse_data()
 {
     QTest::addColumn<QString>("name");
     QTest::newRow("of another folder") << "../neighbour/x.png";
-    QTest::newRow("absolute") << mFixture.titleRoot() + "/neighbour/x.png";
+    QTest::newRow("absolute") << m_fixture.titleRoot() + "/neighbour/x.png";
     QTest::newRow("another title") << "other.xml";
     QTest::newRow("another title in capitals") << "OTHER.XML";
     QTest::newRow("the title itself") << "t.xml";
@@ -292,9 +292,9 @@ void tst_thumbnailrender::slowStageReplacesNothingElse_data()
 void tst_thumbnailrender::slowStageReplacesNothingElse()
 {
     QFETCH(QString, name);
-    const QString neighbour = mFixture.makeFolder(QStringLiteral("neighbour"));
+    const QString neighbour = m_fixture.makeFolder(QStringLiteral("neighbour"));
     paint(neighbour + QStringLiteral("/x.png"), QSize(10, 10), Qt::red);
-    const QString folder = mFixture.makeFolder(QStringLiteral("foreign"));
+    const QString folder = m_fixture.makeFolder(QStringLiteral("foreign"));
     LibraryFixture::fillFolder(folder, {QStringLiteral("t"), QStringLiteral("other")});
     QVERIFY(QFile::copy(folder + QStringLiteral("/other.xml"), folder + QStringLiteral("/OTHER.XML")));
     const auto archive = LibraryFixture::makeRecord(folder, QStringLiteral("t"), QStringLiteral("Foreign"));
@@ -317,7 +317,7 @@ void tst_thumbnailrender::slowStageReplacesNothingElse()
 // Nobody asks whether it has finished.
 void tst_thumbnailrender::slowStageDrawsWhileTheEventsGoOn()
 {
-    const QString folder = mFixture.makeFolder(QStringLiteral("events"));
+    const QString folder = m_fixture.makeFolder(QStringLiteral("events"));
     paint(folder + QStringLiteral("/bg.png"), QSize(1920, 1080), QColor(20, 90, 40));
     FakeTitleChangeReporter reports;
     ThumbnailRender render;
@@ -337,7 +337,7 @@ void tst_thumbnailrender::slowStageDrawsWhileTheEventsGoOn()
 
 void tst_thumbnailrender::waitingWithoutEventsDrawsWhatIsLeft()
 {
-    const QString folder = mFixture.makeFolder(QStringLiteral("blocked"));
+    const QString folder = m_fixture.makeFolder(QStringLiteral("blocked"));
     paint(folder + QStringLiteral("/bg.png"), QSize(1920, 1080), QColor(20, 90, 40));
     const auto archive = LibraryFixture::makeRecord(folder, QStringLiteral("t"), QStringLiteral("Blocked"));
     archive->setBgResourceBig("bg.png");
@@ -352,7 +352,7 @@ void tst_thumbnailrender::waitingWithoutEventsDrawsWhatIsLeft()
 
 void tst_thumbnailrender::textsStandAtOneAndAHalfTimesTheirPlace()
 {
-    const QString folder = mFixture.makeFolder(QStringLiteral("places"));
+    const QString folder = m_fixture.makeFolder(QStringLiteral("places"));
     const auto near = LibraryFixture::makeRecord(folder, QStringLiteral("near"), QString());
     near->setText({LibraryFixture::makeText(QStringLiteral("Hg"), 1, 40, 60)});
     const auto far = LibraryFixture::makeRecord(folder, QStringLiteral("far"), QString());
@@ -367,7 +367,7 @@ void tst_thumbnailrender::textsStandAtOneAndAHalfTimesTheirPlace()
 
 void tst_thumbnailrender::textOutsideTheRasterIsHarmless()
 {
-    const auto archive = LibraryFixture::makeRecord(mFixture.makeFolder(QStringLiteral("outside")),
+    const auto archive = LibraryFixture::makeRecord(m_fixture.makeFolder(QStringLiteral("outside")),
                                                     QStringLiteral("t"), QString());
     archive->setText({LibraryFixture::makeText(QStringLiteral("far"), 1, 1e7F, -1e7F),
                       LibraryFixture::makeText(QStringLiteral("nowhere"), 2, -50000, 50000)});
@@ -378,7 +378,7 @@ void tst_thumbnailrender::textOutsideTheRasterIsHarmless()
 
 void tst_thumbnailrender::middlePictureIsTheBigOneReduced()
 {
-    const auto archive = LibraryFixture::makeRecord(mFixture.makeFolder(QStringLiteral("middle")),
+    const auto archive = LibraryFixture::makeRecord(m_fixture.makeFolder(QStringLiteral("middle")),
                                                     QStringLiteral("t"), QStringLiteral("Half"));
     const QRect big = inkIn(slowPicture(*archive, "_1920.png"));
     const QRect middle = inkIn(slowPicture(*archive, "_960.png"));
@@ -388,7 +388,7 @@ void tst_thumbnailrender::middlePictureIsTheBigOneReduced()
 
 void tst_thumbnailrender::manyRendersLeaveNothingBehind()
 {
-    const auto archive = LibraryFixture::makeRecord(mFixture.makeFolder(QStringLiteral("many")),
+    const auto archive = LibraryFixture::makeRecord(m_fixture.makeFolder(QStringLiteral("many")),
                                                     QStringLiteral("t"), QStringLiteral("Many"));
     ThumbnailRender render;
     const QImage first = fastPicture(render, *archive);

@@ -15,39 +15,39 @@ private Q_SLOTS:
     void laterCopyTakesTheFirstOnesPlace();
 
 private:
-    LibraryFixture mFixture;
-    ArchiveController mController;
-    TitleFileOperations mFiles{mController};
+    LibraryFixture m_fixture;
+    ArchiveController m_controller;
+    TitleFileOperations m_files{m_controller};
 };
 
 void tst_titleclipboard::emptyPastesNothing()
 {
-    const QString folder = mFixture.makeFolder(QStringLiteral("empty"));
+    const QString folder = m_fixture.makeFolder(QStringLiteral("empty"));
     TitleClipboard clipboard;
     QVERIFY(clipboard.isEmpty());
-    QVERIFY(!clipboard.paste(mFiles, folder));
+    QVERIFY(!clipboard.paste(m_files, folder));
     const auto source = LibraryFixture::makeRecord(folder, QStringLiteral("s"), QStringLiteral("Text"));
     clipboard.copy(*source);
     QVERIFY(!clipboard.isEmpty());
-    QVERIFY(!clipboard.paste(mFiles, QString()));
+    QVERIFY(!clipboard.paste(m_files, QString()));
     clipboard.clear();
     QVERIFY(clipboard.isEmpty());
-    QVERIFY(!clipboard.paste(mFiles, folder));
+    QVERIFY(!clipboard.paste(m_files, folder));
     QVERIFY(QDir(folder).entryList(QDir::Files).isEmpty());
 }
 
 void tst_titleclipboard::copySurvivesItsSource()
 {
-    const QString folder = mFixture.makeFolder(QStringLiteral("copy"));
+    const QString folder = m_fixture.makeFolder(QStringLiteral("copy"));
     const auto source = LibraryFixture::makeRecord(folder, QStringLiteral("s"), QStringLiteral("Copy me"));
     LibraryFixture::fillFolder(folder, {QStringLiteral("other")});
-    QVERIFY(mController.saveNewArchive(folder, source.get()));
+    QVERIFY(m_controller.saveNewArchive(folder, source.get()));
     TitleClipboard clipboard;
     clipboard.copy(*source);
-    QVERIFY(mController.deleteArchive(QString::fromStdString(source->getPath())));
+    QVERIFY(m_controller.deleteArchive(QString::fromStdString(source->getPath())));
 
-    const auto first = clipboard.paste(mFiles, folder);
-    const auto second = clipboard.paste(mFiles, folder);
+    const auto first = clipboard.paste(m_files, folder);
+    const auto second = clipboard.paste(m_files, folder);
     QVERIFY(first && second);
     QVERIFY(first->getPath() != second->getPath());
     for (const Archive* made : {first.get(), second.get()})
@@ -56,13 +56,13 @@ void tst_titleclipboard::copySurvivesItsSource()
 
 void tst_titleclipboard::laterCopyTakesTheFirstOnesPlace()
 {
-    const QString folder = mFixture.makeFolder(QStringLiteral("later"));
+    const QString folder = m_fixture.makeFolder(QStringLiteral("later"));
     const auto first = LibraryFixture::makeRecord(folder, QStringLiteral("a"), QStringLiteral("First"));
     const auto second = LibraryFixture::makeRecord(folder, QStringLiteral("b"), QStringLiteral("Second"));
     TitleClipboard clipboard;
     clipboard.copy(*first);
     clipboard.copy(*second);
-    const auto pasted = clipboard.paste(mFiles, folder);
+    const auto pasted = clipboard.paste(m_files, folder);
     QVERIFY(pasted);
     QFile file(QString::fromStdString(pasted->getPath()));
     QVERIFY(file.open(QIODevice::ReadOnly));

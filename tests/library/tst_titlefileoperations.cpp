@@ -20,17 +20,17 @@ class SystemLogCatcher
 public:
     SystemLogCatcher()
     {
-        if (!mFile.open())
+        if (!m_file.open())
             qFatal("no file for the log");
         INIT_LOGGING(L"KS2Titler");
         ::openlog("KS2Titler", LOG_PERROR, LOG_USER);
-        mBefore = ::dup(STDERR_FILENO);
-        ::dup2(mFile.handle(), STDERR_FILENO);
+        m_before = ::dup(STDERR_FILENO);
+        ::dup2(m_file.handle(), STDERR_FILENO);
     }
     ~SystemLogCatcher()
     {
-        ::dup2(mBefore, STDERR_FILENO);
-        ::close(mBefore);
+        ::dup2(m_before, STDERR_FILENO);
+        ::close(m_before);
         ::closelog();
         UNINIT_LOGGING();
     }
@@ -38,13 +38,13 @@ public:
 
     QByteArray text()
     {
-        mFile.seek(0);
-        return mFile.readAll();
+        m_file.seek(0);
+        return m_file.readAll();
     }
 
 private:
-    QTemporaryFile mFile;
-    int mBefore = -1;
+    QTemporaryFile m_file;
+    int m_before = -1;
 };
 
 } // namespace
@@ -83,9 +83,9 @@ private:
         return QString::fromStdString(TitlerUtility::getThumbnailPathFromTitlePath(archive.getPath(), name));
     }
 
-    LibraryFixture mFixture;
-    ArchiveController mController;
-    TitleFileOperations mFiles{mController};
+    LibraryFixture m_fixture;
+    ArchiveController m_controller;
+    TitleFileOperations m_files{m_controller};
 };
 
 void tst_titlefileoperations::thumbnailNames()
@@ -98,7 +98,7 @@ void tst_titlefileoperations::thumbnailNames()
 
 void tst_titlefileoperations::freeStemSkipsTakenNames()
 {
-    const QString folder = mFixture.makeFolder(QStringLiteral("stems"));
+    const QString folder = m_fixture.makeFolder(QStringLiteral("stems"));
     const QDateTime now(QDate(2026, 1, 2), QTime(3, 4, 5, 998));
     QCOMPARE(TitleFileOperations::freeStem(folder, now), QStringLiteral("20260102030405998"));
     writeFile(folder + QStringLiteral("/20260102030405998.xml"), "x");
@@ -109,21 +109,21 @@ void tst_titlefileoperations::freeStemSkipsTakenNames()
 void tst_titlefileoperations::emptyFolderMakesNothing()
 {
     const Archive archive;
-    QVERIFY(!mFiles.createFromTemplate(QString(), archive));
-    QVERIFY(!mFiles.createFromCopy(QString(), archive, TitlePictures()));
+    QVERIFY(!m_files.createFromTemplate(QString(), archive));
+    QVERIFY(!m_files.createFromCopy(QString(), archive, TitlePictures()));
 }
 
 void tst_titlefileoperations::presetKeepsItsBackground()
 {
-    const QString templates = mFixture.makeFolder(QStringLiteral("preset source"));
-    const QString folder = mFixture.makeFolder(QStringLiteral("preset target"));
+    const QString templates = m_fixture.makeFolder(QStringLiteral("preset source"));
+    const QString folder = m_fixture.makeFolder(QStringLiteral("preset target"));
     auto source = LibraryFixture::makeRecord(templates, QStringLiteral("p"), QStringLiteral("Preset"));
     source->setBgResource((templates + QStringLiteral("/bg_1280.jpg")).toStdString());
     source->setBgResourceBig((templates + QStringLiteral("/bg_1920.jpg")).toStdString());
     for (const char* name : {"/p_1920.png", "/p_960.png", "/p_240.png", "/p_240S.png"})
         writeFile(templates + QLatin1String(name), name);
 
-    const auto made = mFiles.createFromTemplate(folder, *source);
+    const auto made = m_files.createFromTemplate(folder, *source);
     QVERIFY(made);
     QCOMPARE(made->getBgResource(), source->getBgResource());
     QCOMPARE(made->getBgResourceBig(), source->getBgResourceBig());
@@ -137,15 +137,15 @@ void tst_titlefileoperations::presetKeepsItsBackground()
     QCOMPARE(readFile(beside(*made, stem + "_240S.png")), QByteArray("/p_240S.png"));
 
     Archive loaded;
-    QVERIFY(mController.getOneArchive(QString::fromStdString(made->getPath()), &loaded));
+    QVERIFY(m_controller.getOneArchive(QString::fromStdString(made->getPath()), &loaded));
     QCOMPARE(loaded.text().size(), std::size_t(1));
     QCOMPARE(loaded.text().front()->getText(), std::string("Preset"));
 }
 
 void tst_titlefileoperations::ownBackgroundIsCopiedUnderNewNames()
 {
-    const QString templates = mFixture.makeFolder(QStringLiteral("own source"));
-    const QString folder = mFixture.makeFolder(QStringLiteral("own 目标"));
+    const QString templates = m_fixture.makeFolder(QStringLiteral("own source"));
+    const QString folder = m_fixture.makeFolder(QStringLiteral("own 目标"));
     auto source = LibraryFixture::makeRecord(templates, QStringLiteral("t"), QStringLiteral("Own"));
     source->setThumbnailSmall("t_240.jpe");
     source->setBgResource("t_source_1280.jpe");
@@ -153,7 +153,7 @@ void tst_titlefileoperations::ownBackgroundIsCopiedUnderNewNames()
     for (const char* name : {"/t_240.jpe", "/t_source_1280.jpe", "/t_source_1920.jpe"})
         writeFile(templates + QLatin1String(name), name);
 
-    const auto made = mFiles.createFromTemplate(folder, *source);
+    const auto made = m_files.createFromTemplate(folder, *source);
     QVERIFY(made);
     const std::string stem = made->getName();
     QCOMPARE(made->getThumbnailSmall(), stem + "_240.jpe");
@@ -166,38 +166,38 @@ void tst_titlefileoperations::ownBackgroundIsCopiedUnderNewNames()
 
 void tst_titlefileoperations::thumbnailWithoutExtensionSkipsTheBackground()
 {
-    const QString folder = mFixture.makeFolder(QStringLiteral("no extension"));
+    const QString folder = m_fixture.makeFolder(QStringLiteral("no extension"));
     auto source = LibraryFixture::makeRecord(folder, QStringLiteral("t"), QStringLiteral("T"));
     source->setThumbnailSmall("thumbnail");
     source->setBgResource("old.png");
-    const auto made = mFiles.createFromTemplate(folder, *source);
+    const auto made = m_files.createFromTemplate(folder, *source);
     QVERIFY(made);
     QCOMPARE(made->getThumbnailSmall(), made->getName() + "_240.png");
     QCOMPARE(made->getBgResource(), std::string("old.png"));
 
     // In another folder this name may be taken.
-    const QString other = mFixture.makeFolder(QStringLiteral("no extension elsewhere"));
+    const QString other = m_fixture.makeFolder(QStringLiteral("no extension elsewhere"));
     writeFile(folder + QStringLiteral("/old.png"), "background");
     writeFile(other + QStringLiteral("/old.png"), "of another title");
-    QVERIFY(mFiles.createFromTemplate(other, *source));
-    QVERIFY(mFiles.createFromCopy(other, *source, TitlePictures()));
+    QVERIFY(m_files.createFromTemplate(other, *source));
+    QVERIFY(m_files.createFromCopy(other, *source, TitlePictures()));
     QCOMPARE(readFile(other + QStringLiteral("/old.png")), QByteArray("of another title"));
 }
 
 void tst_titlefileoperations::copySurvivesItsSource()
 {
-    const QString folder = mFixture.makeFolder(QStringLiteral("copy"));
+    const QString folder = m_fixture.makeFolder(QStringLiteral("copy"));
     const auto source = LibraryFixture::makeRecord(folder, QStringLiteral("s"), QStringLiteral("Copy me"));
     for (const char* name : {"/s_1920.png", "/s_960.png", "/s_240.png", "/s_240S.png"})
         writeFile(folder + QLatin1String(name), name);
     LibraryFixture::fillFolder(folder, {QStringLiteral("other")});
-    QVERIFY(mController.saveNewArchive(folder, source.get()));
+    QVERIFY(m_controller.saveNewArchive(folder, source.get()));
     const TitlePictures pictures = TitleFileOperations::loadPictures(*source);
-    QVERIFY(mController.deleteArchive(QString::fromStdString(source->getPath())));
+    QVERIFY(m_controller.deleteArchive(QString::fromStdString(source->getPath())));
     QVERIFY(!QFile::exists(folder + QStringLiteral("/s_1920.png")));
 
-    const auto first = mFiles.createFromCopy(folder, *source, pictures);
-    const auto second = mFiles.createFromCopy(folder, *source, pictures);
+    const auto first = m_files.createFromCopy(folder, *source, pictures);
+    const auto second = m_files.createFromCopy(folder, *source, pictures);
     QVERIFY(first && second);
     QVERIFY(first->getPath() != second->getPath());
     for (const Archive* made : {first.get(), second.get()}) {
@@ -212,59 +212,59 @@ void tst_titlefileoperations::copySurvivesItsSource()
 
 void tst_titlefileoperations::copyWithoutPicturesMakesTheTitleAlone()
 {
-    const QString folder = mFixture.makeFolder(QStringLiteral("bare copy"));
+    const QString folder = m_fixture.makeFolder(QStringLiteral("bare copy"));
     const auto source = LibraryFixture::makeRecord(folder, QStringLiteral("s"), QStringLiteral("Bare"));
     const TitlePictures pictures = TitleFileOperations::loadPictures(*source);
     QVERIFY(pictures.big.isEmpty() && pictures.small.isEmpty());
-    QVERIFY(mFiles.createFromCopy(folder, *source, pictures));
+    QVERIFY(m_files.createFromCopy(folder, *source, pictures));
     QCOMPARE(QDir(folder).entryList(QDir::Files).size(), 1);
 }
 
 void tst_titlefileoperations::noFileIsLeftAside()
 {
-    const QString folder = mFixture.makeFolder(QStringLiteral("aside"));
+    const QString folder = m_fixture.makeFolder(QStringLiteral("aside"));
     const auto source = LibraryFixture::makeRecord(folder, QStringLiteral("s"), QStringLiteral("A"));
     TitlePictures pictures;
     pictures.big = pictures.middle = pictures.black = pictures.small = QByteArray("picture");
-    QVERIFY(mFiles.createFromCopy(folder, *source, pictures));
+    QVERIFY(m_files.createFromCopy(folder, *source, pictures));
     QCOMPARE(settledEntries(folder).size(), 5);
 }
 
 void tst_titlefileoperations::templateFolderThatCannotBeMadeIsLogged()
 {
-    const QString folder = mFixture.makeFolder(QStringLiteral("no template folder"));
+    const QString folder = m_fixture.makeFolder(QStringLiteral("no template folder"));
     const auto source = LibraryFixture::makeRecord(folder, QStringLiteral("s"), QStringLiteral("A"));
     const QString root = folder + QStringLiteral("/templates");
     writeFile(root, "a file where the folder should be");
     {
         SystemLogCatcher log;
-        QVERIFY(!mFiles.createUserTemplate(root, QStringLiteral("UserTemplate_001"), *source));
+        QVERIFY(!m_files.createUserTemplate(root, QStringLiteral("UserTemplate_001"), *source));
         QVERIFY2(log.text().contains("ERROR create dir."), log.text());
     }
     QCOMPARE(readFile(root), QByteArray("a file where the folder should be"));
 
-    const QString good = mFixture.makeFolder(QStringLiteral("template folder"));
+    const QString good = m_fixture.makeFolder(QStringLiteral("template folder"));
     SystemLogCatcher log;
-    QVERIFY(mFiles.createUserTemplate(good, QStringLiteral("UserTemplate_001"), *source));
+    QVERIFY(m_files.createUserTemplate(good, QStringLiteral("UserTemplate_001"), *source));
     QVERIFY2(!log.text().contains("ERROR"), log.text());
 }
 
 // The name is chosen from an order file, which may have been unreadable.
 void tst_titlefileoperations::templateThatIsThereStays()
 {
-    const QString folder = mFixture.makeFolder(QStringLiteral("templates"));
+    const QString folder = m_fixture.makeFolder(QStringLiteral("templates"));
     const auto first = LibraryFixture::makeRecord(folder, QStringLiteral("s"), QStringLiteral("first"));
     const auto second = LibraryFixture::makeRecord(folder, QStringLiteral("t"), QStringLiteral("second"));
-    const auto made = mFiles.createUserTemplate(folder, QStringLiteral("UserTemplate_001"), *first);
+    const auto made = m_files.createUserTemplate(folder, QStringLiteral("UserTemplate_001"), *first);
     QVERIFY(made);
     const QString path = QString::fromStdString(made->getPath());
     const QByteArray before = readFile(path);
     QVERIFY(!before.isEmpty());
-    QVERIFY(!mFiles.createUserTemplate(folder, QStringLiteral("UserTemplate_001"), *second));
+    QVERIFY(!m_files.createUserTemplate(folder, QStringLiteral("UserTemplate_001"), *second));
     QCOMPARE(readFile(path), before);
     // Its folder alone does not keep the name.
     QVERIFY(QFile::remove(path));
-    QVERIFY(mFiles.createUserTemplate(folder, QStringLiteral("UserTemplate_001"), *second));
+    QVERIFY(m_files.createUserTemplate(folder, QStringLiteral("UserTemplate_001"), *second));
 }
 
 QTEST_GUILESS_MAIN(tst_titlefileoperations)

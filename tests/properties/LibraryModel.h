@@ -67,21 +67,21 @@ public:
             select(0);
     }
 
-    bool canUndo() const { return mIndex > 0; }
-    bool canRedo() const { return mIndex < mCommands.size(); }
+    bool canUndo() const { return m_index > 0; }
+    bool canRedo() const { return m_index < m_commands.size(); }
 
     void clearStack()
     {
-        mCommands.clear();
-        mIndex = 0;
-        mClean = 0;
+        m_commands.clear();
+        m_index = 0;
+        m_clean = 0;
     }
 
     // Returns the titles that are listed or can be restored by undo or redo.
     QSet<QString> reachable() const
     {
         QSet<QString> stems(order.begin(), order.end());
-        for (const Command& command : mCommands)
+        for (const Command& command : m_commands)
             stems << command.title << command.other;
         stems.remove(QString());
         return stems;
@@ -93,9 +93,9 @@ public:
         static const char* const NAMES[] = {"paste",       "delete",      "move",      "focus",
                                             "create text", "delete text", "edit text", "move text"};
         QStringList told;
-        for (const Command& command : mCommands)
+        for (const Command& command : m_commands)
             told << QStringLiteral("%1 %2 %3").arg(NAMES[command.kind], command.title).arg(command.id);
-        told.insert(mIndex, QStringLiteral("|"));
+        told.insert(m_index, QStringLiteral("|"));
         return told.join(QStringLiteral(", "));
     }
 
@@ -137,11 +137,11 @@ public:
             return;
         Command command{Command::FOCUS, stem, selected};
         changeFocus(stem);
-        if (mIndex == mClean)
+        if (m_index == m_clean)
             return; // selecting a title is not an undo step while the stack is clean
-        if (mIndex > 0 && mCommands[mIndex - 1].kind == Command::FOCUS) {
+        if (m_index > 0 && m_commands[m_index - 1].kind == Command::FOCUS) {
             dropRedo();
-            mCommands[mIndex - 1].title = stem;
+            m_commands[m_index - 1].title = stem;
             return;
         }
         push(command);
@@ -190,13 +190,13 @@ public:
     void undo()
     {
         if (canUndo())
-            perform(mCommands[--mIndex], false);
+            perform(m_commands[--m_index], false);
     }
 
     void redo()
     {
         if (canRedo())
-            perform(mCommands[mIndex++], true);
+            perform(m_commands[m_index++], true);
     }
 
     // Makes the pictures of the title shown, as the canvas does.
@@ -278,20 +278,20 @@ private:
 
     void dropRedo()
     {
-        mCommands.resize(mIndex);
-        if (mClean > mIndex)
-            mClean = -1;
+        m_commands.resize(m_index);
+        if (m_clean > m_index)
+            m_clean = -1;
     }
 
     void push(const Command& command)
     {
         dropRedo();
-        mCommands.append(command);
-        ++mIndex;
-        if (mCommands.size() > UNDO_LIMIT) {
-            mCommands.removeFirst();
-            --mIndex;
-            mClean = std::max<qsizetype>(mClean - 1, -1);
+        m_commands.append(command);
+        ++m_index;
+        if (m_commands.size() > UNDO_LIMIT) {
+            m_commands.removeFirst();
+            --m_index;
+            m_clean = std::max<qsizetype>(m_clean - 1, -1);
         }
     }
 
@@ -378,7 +378,7 @@ private:
         }
     }
 
-    QList<Command> mCommands;
-    qsizetype mIndex = 0; // index of the next command to redo
-    qsizetype mClean = 0; // -1 when the clean state was dropped
+    QList<Command> m_commands;
+    qsizetype m_index = 0; // index of the next command to redo
+    qsizetype m_clean = 0; // -1 when the clean state was dropped
 };

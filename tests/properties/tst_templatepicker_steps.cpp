@@ -49,9 +49,9 @@ private:
     QString verify() const;
     void startPicker();
     QString newName();
-    QString randomName() { return mNames.at(random(int(mNames.size()))); }
-    int random(int bound) { return int(mRandom.bounded(quint32(bound))); }
-    QString folderOf(const QString& name) const { return mFixture.userRoot() + '/' + name; }
+    QString randomName() { return m_names.at(random(int(m_names.size()))); }
+    int random(int bound) { return int(m_random.bounded(quint32(bound))); }
+    QString folderOf(const QString& name) const { return m_fixture.userRoot() + '/' + name; }
     // As it is told by others: the folder, with a slash or not, or a file in it.
     QString pathOf(const QString& name)
     {
@@ -61,19 +61,19 @@ private:
     // Files get ages of their own: the order at a start is that of their times.
     void makeYoungest(const QString& name);
     void forget(const QString& name);
-    TemplateTab* tab() const { return mPicker->userTab(); }
+    TemplateTab* tab() const { return m_picker->userTab(); }
 
-    TemplateFixture mFixture;
-    FakeMessageBoxController mMessages;
-    FakeTitleChangeReporter mReports;
-    std::unique_ptr<TemplatePicker> mPicker;
-    QRandomGenerator mRandom;
-    QStringList mNames;
-    QString mChosen;
-    QString mLastChosen; // remembered over a start
-    QString mDoing;
-    int mMade = 0;
-    int mAge = 0;
+    TemplateFixture m_fixture;
+    FakeMessageBoxController m_messages;
+    FakeTitleChangeReporter m_reports;
+    std::unique_ptr<TemplatePicker> m_picker;
+    QRandomGenerator m_random;
+    QStringList m_names;
+    QString m_chosen;
+    QString m_lastChosen; // remembered over a start
+    QString m_doing;
+    int m_made = 0;
+    int m_age = 0;
 };
 
 void tst_templatepicker_steps::initTestCase()
@@ -87,13 +87,13 @@ void tst_templatepicker_steps::randomOrder()
     const int steps = runLength("TITLER_STEPS", DEFAULT_STEPS);
     const RandomSeed seed(20267);
     qInfo("seed %u", quint32(seed));
-    mRandom.seed(seed);
-    mFixture.resetTemplates();
+    m_random.seed(seed);
+    m_fixture.resetTemplates();
     startPicker();
     QStringList log;
     for (int i = 1; i <= steps; ++i) {
         step();
-        log.append(mDoing);
+        log.append(m_doing);
         const QString failure = verify();
         QVERIFY2(failure.isEmpty(),
                  qPrintable(QStringLiteral("seed %1, step %2: %3\n%4")
@@ -106,9 +106,9 @@ void tst_templatepicker_steps::randomOrder()
 void tst_templatepicker_steps::step()
 {
     using Action = void (tst_templatepicker_steps::*)();
-    const int more = qMax(1, COMFORTABLE_COUNT - int(mNames.size()));
-    const int fewer = mNames.isEmpty() ? 0 : qMax(1, int(mNames.size()) - COMFORTABLE_COUNT);
-    const int some = mNames.isEmpty() ? 0 : 3;
+    const int more = qMax(1, COMFORTABLE_COUNT - int(m_names.size()));
+    const int fewer = m_names.isEmpty() ? 0 : qMax(1, int(m_names.size()) - COMFORTABLE_COUNT);
+    const int some = m_names.isEmpty() ? 0 : 3;
     const QList<QPair<int, Action>> actions{{more, &tst_templatepicker_steps::save},
                                             {more, &tst_templatepicker_steps::importNew},
                                             {some, &tst_templatepicker_steps::importOverOne},
@@ -134,78 +134,78 @@ void tst_templatepicker_steps::step()
 
 void tst_templatepicker_steps::startPicker()
 {
-    mPicker.reset();
+    m_picker.reset();
     UserTemplateManager::cleanUp();
-    mPicker = std::make_unique<TemplatePicker>();
-    mPicker->show(); // only then its parts have their places
-    mPicker->showUserTemplateTab();
+    m_picker = std::make_unique<TemplatePicker>();
+    m_picker->show(); // only then its parts have their places
+    m_picker->showUserTemplateTab();
 }
 
 QString tst_templatepicker_steps::newName()
 {
     static const char* const patterns[] = {"UserTemplate_%1", "片头 %1", "テロップ%1", "자막 & <%1>",
                                            "a.b %1"};
-    return QString::fromUtf8(patterns[random(5)]).arg(++mMade, 3, 10, QLatin1Char('0'));
+    return QString::fromUtf8(patterns[random(5)]).arg(++m_made, 3, 10, QLatin1Char('0'));
 }
 
 void tst_templatepicker_steps::makeYoungest(const QString& name)
 {
     FileSyncQueue::flush(std::chrono::seconds(30));
-    QFile file(mFixture.userTitle(name));
+    QFile file(m_fixture.userTitle(name));
     if (!file.open(QIODevice::ReadWrite) ||
-        !file.setFileTime(QDateTime::fromSecsSinceEpoch(5000 + ++mAge), QFile::FileModificationTime))
+        !file.setFileTime(QDateTime::fromSecsSinceEpoch(5000 + ++m_age), QFile::FileModificationTime))
         qFatal("no title of %s", qPrintable(name));
 }
 
 void tst_templatepicker_steps::forget(const QString& name)
 {
-    mNames.removeAll(name);
-    if (mChosen == name)
-        mChosen.clear();
-    if (mLastChosen == name)
-        mLastChosen.clear();
+    m_names.removeAll(name);
+    if (m_chosen == name)
+        m_chosen.clear();
+    if (m_lastChosen == name)
+        m_lastChosen.clear();
 }
 
 void tst_templatepicker_steps::save()
 {
     const QString name = newName();
-    mDoing = "save " + name;
-    mFixture.makeUserTemplate(name);
+    m_doing = "save " + name;
+    m_fixture.makeUserTemplate(name);
     makeYoungest(name);
-    mPicker->slotSaveAsTemplate(name);
-    mNames.append(name);
-    mChosen = name;
-    mLastChosen = name;
+    m_picker->slotSaveAsTemplate(name);
+    m_names.append(name);
+    m_chosen = name;
+    m_lastChosen = name;
 }
 
 void tst_templatepicker_steps::importNew()
 {
     const QString name = newName();
-    mDoing = "import " + name;
-    mFixture.makeUserPictures(name);
-    mPicker->slotImportNewUserTemplate(random(2) == 0 ? name : pathOf(name));
+    m_doing = "import " + name;
+    m_fixture.makeUserPictures(name);
+    m_picker->slotImportNewUserTemplate(random(2) == 0 ? name : pathOf(name));
     makeYoungest(name);
-    mNames.append(name);
+    m_names.append(name);
 }
 
 void tst_templatepicker_steps::importOverOne()
 {
     const QString name = randomName();
-    mDoing = "import over " + name;
-    mPicker->slotImportNewUserTemplate(random(2) == 0 ? name : pathOf(name));
+    m_doing = "import over " + name;
+    m_picker->slotImportNewUserTemplate(random(2) == 0 ? name : pathOf(name));
     makeYoungest(name);
-    mNames.removeAll(name);
-    mNames.append(name);
-    if (mChosen == name)
-        mChosen.clear(); // it is another template now
+    m_names.removeAll(name);
+    m_names.append(name);
+    if (m_chosen == name)
+        m_chosen.clear(); // it is another template now
 }
 
 void tst_templatepicker_steps::importOfOneThatWent()
 {
     const QString name = randomName();
-    mDoing = "import of the missing " + name;
+    m_doing = "import of the missing " + name;
     QVERIFY(QDir(folderOf(name)).removeRecursively());
-    mPicker->slotImportNewUserTemplate(random(2) == 0 ? name : pathOf(name));
+    m_picker->slotImportNewUserTemplate(random(2) == 0 ? name : pathOf(name));
     forget(name);
 }
 
@@ -213,75 +213,75 @@ void tst_templatepicker_steps::renameOutside()
 {
     const QString before = randomName();
     const QString after = newName();
-    mDoing = "rename " + before + " to " + after;
-    QVERIFY(QDir(mFixture.userRoot()).rename(before, after));
-    mPicker->slotRenameUserTemplate(before, after, pathOf(after));
-    mNames[mNames.indexOf(before)] = after;
-    if (mLastChosen == before)
-        mLastChosen = mChosen == before ? after : QString();
-    if (mChosen == before)
-        mChosen = after;
+    m_doing = "rename " + before + " to " + after;
+    QVERIFY(QDir(m_fixture.userRoot()).rename(before, after));
+    m_picker->slotRenameUserTemplate(before, after, pathOf(after));
+    m_names[m_names.indexOf(before)] = after;
+    if (m_lastChosen == before)
+        m_lastChosen = m_chosen == before ? after : QString();
+    if (m_chosen == before)
+        m_chosen = after;
 }
 
 void tst_templatepicker_steps::deleteOutside()
 {
     const QString name = randomName();
-    mDoing = "delete outside " + name;
+    m_doing = "delete outside " + name;
     QVERIFY(QDir(folderOf(name)).removeRecursively());
-    mPicker->slotDeleteUserTemplate(pathOf(name));
+    m_picker->slotDeleteUserTemplate(pathOf(name));
     forget(name);
 }
 
 void tst_templatepicker_steps::deleteByQuestion()
 {
-    mDoing = "ask about " + mChosen;
-    mPicker->deleteClicked2();
-    const Reports asked = mMessages.take();
-    QCOMPARE(asked, mChosen.isEmpty() ? Reports() : (Reports{{43, mChosen}}));
+    m_doing = "ask about " + m_chosen;
+    m_picker->deleteClicked2();
+    const Reports asked = m_messages.take();
+    QCOMPARE(asked, m_chosen.isEmpty() ? Reports() : (Reports{{43, m_chosen}}));
     const int kind = random(4);
     if (kind == 0) {
-        mDoing += " and answer another question first";
-        Q_EMIT mMessages.signalCloseMessage({1, MessageDefine::CLOSE_OK, 109});
+        m_doing += " and answer another question first";
+        Q_EMIT m_messages.signalCloseMessage({1, MessageDefine::CLOSE_OK, 109});
     }
     if (kind == 1) {
-        mDoing += " and keep it";
-        Q_EMIT mMessages.signalCloseMessage({1, MessageDefine::CLOSE_CANCEL, 43});
+        m_doing += " and keep it";
+        Q_EMIT m_messages.signalCloseMessage({1, MessageDefine::CLOSE_CANCEL, 43});
         return;
     }
-    Q_EMIT mMessages.signalCloseMessage({1, MessageDefine::CLOSE_OK, 43});
-    if (!mChosen.isEmpty()) {
-        QVERIFY(!QFileInfo::exists(folderOf(mChosen)));
-        forget(QString(mChosen));
+    Q_EMIT m_messages.signalCloseMessage({1, MessageDefine::CLOSE_OK, 43});
+    if (!m_chosen.isEmpty()) {
+        QVERIFY(!QFileInfo::exists(folderOf(m_chosen)));
+        forget(QString(m_chosen));
     }
 }
 
 void tst_templatepicker_steps::choose()
 {
-    const int id = random(int(mNames.size()));
-    mDoing = "choose " + mNames.at(id);
+    const int id = random(int(m_names.size()));
+    m_doing = "choose " + m_names.at(id);
     tab()->item(id)->clickTriggered();
-    mChosen = mNames.at(id);
-    mLastChosen = mChosen;
+    m_chosen = m_names.at(id);
+    m_lastChosen = m_chosen;
 }
 
 void tst_templatepicker_steps::noticesOfNothing()
 {
-    mDoing = "notices of what is not there";
-    mPicker->slotDeleteUserTemplate(folderOf("nobody") + '/');
-    mPicker->slotRenameUserTemplate("nobody", "somebody", folderOf("somebody") + '/');
-    mPicker->slotImportNewUserTemplate("nobody");
-    mPicker->slotDeleteUserTemplate(QString());
+    m_doing = "notices of what is not there";
+    m_picker->slotDeleteUserTemplate(folderOf("nobody") + '/');
+    m_picker->slotRenameUserTemplate("nobody", "somebody", folderOf("somebody") + '/');
+    m_picker->slotImportNewUserTemplate("nobody");
+    m_picker->slotDeleteUserTemplate(QString());
 }
 
 void tst_templatepicker_steps::readAgain()
 {
     const bool isStart = random(2) == 0;
-    mDoing = isStart ? "start" : "read again";
+    m_doing = isStart ? "start" : "read again";
     if (isStart)
         startPicker();
     else
-        mPicker->reloadTemplates2();
-    mChosen = mLastChosen;
+        m_picker->reloadTemplates2();
+    m_chosen = m_lastChosen;
 }
 
 QString tst_templatepicker_steps::verify() const
@@ -292,28 +292,28 @@ QString tst_templatepicker_steps::verify() const
         const TemplateItem* item = tab()->item(id);
         if (item->getIndex() != id || !item->isUser())
             return QStringLiteral("item %1 is another").arg(id);
-        if (hasSelectedStyle(item) != (shown.constLast() == mChosen))
+        if (hasSelectedStyle(item) != (shown.constLast() == m_chosen))
             return QStringLiteral("the frame of %1").arg(shown.constLast());
-        if (QString::fromStdString(tab()->archive(id)->getPath()) != mFixture.userTitle(shown.constLast()))
+        if (QString::fromStdString(tab()->archive(id)->getPath()) != m_fixture.userTitle(shown.constLast()))
             return QStringLiteral("the path of %1").arg(shown.constLast());
     }
-    if (shown != mNames)
-        return "shown are " + shown.join(", ") + " and not " + mNames.join(", ");
-    if (mFixture.userOrder() != mNames)
-        return "the order file has " + mFixture.userOrder().join(", ");
-    QStringList folders = QDir(mFixture.userRoot()).entryList(QDir::Dirs | QDir::NoDotAndDotDot);
-    QStringList names = mNames;
+    if (shown != m_names)
+        return "shown are " + shown.join(", ") + " and not " + m_names.join(", ");
+    if (m_fixture.userOrder() != m_names)
+        return "the order file has " + m_fixture.userOrder().join(", ");
+    QStringList folders = QDir(m_fixture.userRoot()).entryList(QDir::Dirs | QDir::NoDotAndDotDot);
+    QStringList names = m_names;
     folders.sort();
     names.sort();
     if (folders != names)
         return "on disk are " + folders.join(", ");
     const Archive* chosen = tab()->selectedArchive();
-    if ((chosen ? TemplateTab::templateName(*chosen) : QString()) != mChosen)
-        return "chosen is another than " + mChosen;
+    if ((chosen ? TemplateTab::templateName(*chosen) : QString()) != m_chosen)
+        return "chosen is another than " + m_chosen;
     for (const char* button : {"selectUserButton", "deleteTemplateButton"})
-        if (mPicker->findChild<KSPushbutton*>(button)->isEnabled() == mChosen.isEmpty())
-            return QLatin1String(button) + QStringLiteral(" with the choice ") + mChosen;
-    if (mPicker->findChild<QLabel*>("fileName")->text().isEmpty() != mChosen.isEmpty())
+        if (m_picker->findChild<KSPushbutton*>(button)->isEnabled() == m_chosen.isEmpty())
+            return QLatin1String(button) + QStringLiteral(" with the choice ") + m_chosen;
+    if (m_picker->findChild<QLabel*>("fileName")->text().isEmpty() != m_chosen.isEmpty())
         return "the name beside the grid";
     return {};
 }

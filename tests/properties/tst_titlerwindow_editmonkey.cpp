@@ -89,40 +89,40 @@ private Q_SLOTS:
 
 private:
     QString writeFolder();
-    CanvasScene* scene() const { return mWindow->findChild<CanvasScene*>(); }
+    CanvasScene* scene() const { return m_window->findChild<CanvasScene*>(); }
     void look(int touches) const;
     QString misplaced() const;
     QByteArray replay(const QString& name);
 
-    MonkeyGround::DataInMemory mInMemory;
-    LibraryFixture mFiles; // titles are edited below their root only
-    QTemporaryDir mData;
-    Siblings mSiblings;
-    TitlerWindow* mWindow = nullptr;
-    TouchDevice mDevice;
-    int mTouches = 0;
+    MonkeyGround::DataInMemory m_inMemory;
+    LibraryFixture m_files; // titles are edited below their root only
+    QTemporaryDir m_data;
+    Siblings m_siblings;
+    TitlerWindow* m_window = nullptr;
+    TouchDevice m_device;
+    int m_touches = 0;
 };
 
 void tst_titlerwindow_editmonkey::initTestCase()
 {
-    mTouches = runLength("TITLER_TOUCHES", DEFAULT_TOUCHES);
-    qInfo("seed %u, %d touches", quint32(RandomSeed(DEFAULT_SEED)), mTouches);
+    m_touches = runLength("TITLER_TOUCHES", DEFAULT_TOUCHES);
+    qInfo("seed %u, %d touches", quint32(RandomSeed(DEFAULT_SEED)), m_touches);
     MonkeyGround::showErrorsOnly();
-    QVERIFY(mSiblings.listenOnFreePorts());
-    mWindow = makeWaitingWindow();
+    QVERIFY(m_siblings.listenOnFreePorts());
+    m_window = makeWaitingWindow();
 }
 
 void tst_titlerwindow_editmonkey::cleanupTestCase()
 {
     MonkeyGround::Application::instance()->frozen = false;
-    delete mWindow;
+    delete m_window;
     pMainWindow = nullptr;
     APPEventFilter::release();
 }
 
 QString tst_titlerwindow_editmonkey::writeFolder()
 {
-    const QString folder = mFiles.makeFolder(QStringLiteral("monkey"));
+    const QString folder = m_files.makeFolder(QStringLiteral("monkey"));
     Archive archive;
     archive.setPath((folder + "/title.xml").toStdString());
     archive.setThumbnailBig("title_1920.png");
@@ -166,23 +166,23 @@ void tst_titlerwindow_editmonkey::look(int touches) const
     QVERIFY2(texts.size() <= CanvasScene::MAX_TEXT_OBJECTS, qPrintable(QString::number(touches)));
     for (const GraphicsText* text : texts)
         QVERIFY2(inStep(*text), qPrintable(QString("out of step after %1 touches").arg(touches)));
-    QVERIFY(mWindow->isVisible());
+    QVERIFY(m_window->isVisible());
 }
 
 void tst_titlerwindow_editmonkey::manyTouches()
 {
     const QString folder = writeFolder();
     const QString path = folder + "/title.xml";
-    mWindow->showTitlerWindow({_titler_paramter::CREATE_OR_EDIT, path.toStdWString()});
-    QVERIFY(QTest::qWaitForWindowExposed(mWindow, PATIENCE_MS));
+    m_window->showTitlerWindow({_titler_paramter::CREATE_OR_EDIT, path.toStdWString()});
+    QVERIFY(QTest::qWaitForWindowExposed(m_window, PATIENCE_MS));
     QCOMPARE(scene()->getTextItemList().size(), 2);
     MonkeyGround::Application::instance()->frozen = true;
     QElapsedTimer clock;
     clock.start();
 
     const RandomSeed seed(DEFAULT_SEED);
-    CanvasFingers fingers(*mWindow, mDevice, seed);
-    for (int steps = 1; fingers.touches() < mTouches; ++steps) {
+    CanvasFingers fingers(*m_window, m_device, seed);
+    for (int steps = 1; fingers.touches() < m_touches; ++steps) {
         fingers.act();
         if (!fingers.isTouching()) {
             QVERIFY2(misplaced().isEmpty(),
@@ -197,16 +197,16 @@ void tst_titlerwindow_editmonkey::manyTouches()
         look(fingers.touches());
         if (QTest::currentTestFailed())
             return;
-        mSiblings.forget();
+        m_siblings.forget();
     }
     fingers.liftAll();
     MonkeyGround::Application::instance()->frozen = false;
     QCOMPARE(heldLocks(), QString());
     const qint64 touched = clock.elapsed();
 
-    mWindow->hideSoftWareWithDeleteEmptyItems();
-    mWindow->saveCurrentTitle();
-    QTRY_VERIFY(mWindow->dataSaveIsFinished());
+    m_window->hideSoftWareWithDeleteEmptyItems();
+    m_window->saveCurrentTitle();
+    QTRY_VERIFY(m_window->dataSaveIsFinished());
     std::vector<TText*> shown;
     const QList<GraphicsText*> texts = scene()->getTextItemList();
     for (const GraphicsText* text : texts) {
@@ -230,13 +230,13 @@ void tst_titlerwindow_editmonkey::manyTouches()
     fprintf(stderr, "seed %u: %d touches in %lld ms, %d texts left\n", quint32(seed), fingers.touches(),
             touched, int(shown.size()));
 
-    mWindow->closeTitlerWindow();
-    QVERIFY(!mWindow->isVisible());
-    mWindow->showTitlerWindow({_titler_paramter::CREATE_OR_EDIT, path.toStdWString()});
+    m_window->closeTitlerWindow();
+    QVERIFY(!m_window->isVisible());
+    m_window->showTitlerWindow({_titler_paramter::CREATE_OR_EDIT, path.toStdWString()});
     QCOMPARE(scene()->getTextItemList().size(), qsizetype(saved.text().size()));
     for (const GraphicsText* text : scene()->getTextItemList())
         QVERIFY(inStep(*text));
-    mWindow->closeTitlerWindow();
+    m_window->closeTitlerWindow();
 }
 
 // A process of its own, since the panel remembers the last styles.
@@ -244,16 +244,16 @@ QByteArray tst_titlerwindow_editmonkey::replay(const QString& name)
 {
     QProcess process;
     QProcessEnvironment environment = QProcessEnvironment::systemEnvironment();
-    QDir(mData.path()).mkpath(name);
-    environment.insert(QStringLiteral("XDG_DATA_HOME"), mData.filePath(name));
+    QDir(m_data.path()).mkpath(name);
+    environment.insert(QStringLiteral("XDG_DATA_HOME"), m_data.filePath(name));
     environment.insert(QStringLiteral("TITLER_SEED"), QString::number(quint32(RandomSeed(DEFAULT_SEED))));
     environment.insert(QStringLiteral("TITLER_TOUCHES"), QString::number(REPLAYED_TOUCHES));
-    environment.insert(QString::fromLatin1(DIGEST_VARIABLE), mData.filePath(name + ".txt"));
+    environment.insert(QString::fromLatin1(DIGEST_VARIABLE), m_data.filePath(name + ".txt"));
     process.setProcessEnvironment(environment);
     process.start(QCoreApplication::applicationFilePath(), {QStringLiteral("manyTouches")});
     if (!process.waitForFinished(REPLAY_TIMEOUT) || process.exitCode() != 0)
         return process.readAllStandardOutput();
-    return bytesOf(mData.filePath(name + ".txt"));
+    return bytesOf(m_data.filePath(name + ".txt"));
 }
 
 void tst_titlerwindow_editmonkey::seedReplays()

@@ -93,7 +93,7 @@ QByteArray describe(const LibraryModel::Texts& texts)
 #define CHECK(condition)                                                                                     \
     do {                                                                                                     \
         if (!(condition)) {                                                                                  \
-            mFailure = QStringLiteral(#condition " at line %1").arg(__LINE__);                               \
+            m_failure = QStringLiteral(#condition " at line %1").arg(__LINE__);                              \
             return false;                                                                                    \
         }                                                                                                    \
     } while (false)
@@ -133,7 +133,7 @@ private:
     bool leaveText(bool deleteBlank, const std::function<void()>& action);
     bool leaveText()
     {
-        return leaveText(true, [this] { mWindow->hideSoftWareWithDeleteEmptyItems(); });
+        return leaveText(true, [this] { m_window->hideSoftWareWithDeleteEmptyItems(); });
     }
     bool takeCommands(int wanted);
 
@@ -144,141 +144,142 @@ private:
     QSet<QString> toldTitles() const;
     bool waitForPictures();
     std::unique_ptr<Archive> read(const QString& stem) const;
-    QString fileOf(const QString& stem) const { return mFolder + QLatin1Char('/') + stem + ".xml"; }
+    QString fileOf(const QString& stem) const { return m_folder + QLatin1Char('/') + stem + ".xml"; }
     QString stemOf(const ArchiveItem* item) const
     {
         return item ? QFileInfo(item->getArchiveDataPath()).completeBaseName() : QString();
     }
-    int random(int bound) { return int(mRandom.bounded(quint32(bound))); }
-    int randomRow() { return random(int(mModel.order.size())); }
+    int random(int bound) { return int(m_random.bounded(quint32(bound))); }
+    int randomRow() { return random(int(m_model.order.size())); }
     int randomTextId();
     void request();
 
-    TemplateFixture mFixture;
-    Siblings mSiblings;
-    TitlerWindow* mWindow = nullptr;
-    ArchiveList* mList = nullptr;
-    CanvasScene* mScene = nullptr;
-    TemplatePicker* mPicker = nullptr;
-    ToolsBar* mBar = nullptr;
-    QAction* mUndo = nullptr;
-    QAction* mRedo = nullptr;
-    int mTextCommands = 0; // that the canvas has pushed since they were last looked at
+    TemplateFixture m_fixture;
+    Siblings m_siblings;
+    TitlerWindow* m_window = nullptr;
+    ArchiveList* m_list = nullptr;
+    CanvasScene* m_scene = nullptr;
+    TemplatePicker* m_picker = nullptr;
+    ToolsBar* m_bar = nullptr;
+    QAction* m_undo = nullptr;
+    QAction* m_redo = nullptr;
+    int m_textCommands = 0; // that the canvas has pushed since they were last looked at
 
-    QRandomGenerator mRandom;
-    LibraryModel mModel;
-    QMap<QString, LibraryModel::Texts> mTemplates; // the operator's
-    int mTemplateNumber = 0;
-    std::optional<LibraryModel::Texts> mCopy;
-    std::optional<TText> mPending; // state before what is being typed
-    QString mPendingText;
-    QString mFolder;
-    QString mFailure;
-    QString mDoing;
-    QStringList mLog;
-    QMap<QString, Stamp> mStamps;
-    QMap<QString, QByteArray> mPictureSums; // by path; of the stamp in mStamps
-    QList<QPair<LibraryModel::Texts, QByteArrayList>> mKnownPictures;
-    std::function<void()> mInDialog;
-    int mDialogs = 0;
-    int mComparedPictures = 0;
-    int mTyped = 0;
+    QRandomGenerator m_random;
+    LibraryModel m_model;
+    QMap<QString, LibraryModel::Texts> m_templates; // the operator's
+    int m_templateNumber = 0;
+    std::optional<LibraryModel::Texts> m_copy;
+    std::optional<TText> m_pending; // state before what is being typed
+    QString m_pendingText;
+    QString m_folder;
+    QString m_failure;
+    QString m_doing;
+    QStringList m_log;
+    QMap<QString, Stamp> m_stamps;
+    QMap<QString, QByteArray> m_pictureSums; // by path; of the stamp in m_stamps
+    QList<QPair<LibraryModel::Texts, QByteArrayList>> m_knownPictures;
+    std::function<void()> m_inDialog;
+    int m_dialogs = 0;
+    int m_comparedPictures = 0;
+    int m_typed = 0;
 };
 
 void tst_titlerwindow_library::initTestCase()
 {
     QLoggingCategory::setFilterRules("*.debug=false"); // else the test library stops printing
-    QVERIFY(mSiblings.listenOnFreePorts());
-    mFixture.resetTemplates();
-    mFixture.makePresets("templates_en", {"lower", "strap", "速報"});
-    mFixture.makePresets("templates_chs", {"xia"});
+    QVERIFY(m_siblings.listenOnFreePorts());
+    m_fixture.resetTemplates();
+    m_fixture.makePresets("templates_en", {"lower", "strap", "速報"});
+    m_fixture.makePresets("templates_chs", {"xia"});
     APPEventFilter::instance();
     Q_INIT_RESOURCE(UILibrary);
     Q_INIT_RESOURCE(TitlerToolResource);
-    mWindow = new TitlerWindow(true, nullptr);
-    pMainWindow = mWindow;
-    mWindow->setRealClose(false);
-    mList = mWindow->findChild<ArchiveList*>();
-    mScene = mWindow->findChild<CanvasScene*>();
-    mPicker = mWindow->findChild<TemplatePicker*>();
-    mBar = mWindow->findChild<ToolsBar*>();
-    for (QAction* action : mWindow->findChildren<QAction*>(QString(), Qt::FindDirectChildrenOnly)) {
+    m_window = new TitlerWindow(true, nullptr);
+    pMainWindow = m_window;
+    m_window->setRealClose(false);
+    m_list = m_window->findChild<ArchiveList*>();
+    m_scene = m_window->findChild<CanvasScene*>();
+    m_picker = m_window->findChild<TemplatePicker*>();
+    m_bar = m_window->findChild<ToolsBar*>();
+    for (QAction* action : m_window->findChildren<QAction*>(QString(), Qt::FindDirectChildrenOnly)) {
         if (action->text().startsWith("Undo"))
-            mUndo = action;
+            m_undo = action;
         if (action->text().startsWith("Redo"))
-            mRedo = action;
+            m_redo = action;
     }
-    QVERIFY(mList && mScene && mPicker && mBar && mUndo && mRedo);
+    QVERIFY(m_list && m_scene && m_picker && m_bar && m_undo && m_redo);
     // Nobody looks at the window: what it would paint costs more than all the rest.
-    mWindow->setUpdatesEnabled(false);
-    mPicker->setUpdatesEnabled(false);
-    connect(mScene, &CanvasScene::signalPushUndoCommandIntoStack, this, [this] { ++mTextCommands; });
+    m_window->setUpdatesEnabled(false);
+    m_picker->setUpdatesEnabled(false);
+    connect(m_scene, &CanvasScene::signalPushUndoCommandIntoStack, this, [this] { ++m_textCommands; });
     // The dialog runs an event loop of its own: what is to be done in it is done from there.
     auto* watch = new QTimer(this);
     connect(watch, &QTimer::timeout, this, [this] {
-        if (!mPicker->isVisible())
+        if (!m_picker->isVisible())
             return;
-        ++mDialogs;
-        if (mInDialog)
-            std::exchange(mInDialog, nullptr)();
-        mPicker->reject();
+        ++m_dialogs;
+        if (m_inDialog)
+            std::exchange(m_inDialog, nullptr)();
+        m_picker->reject();
     });
     watch->start(0);
 }
 
 void tst_titlerwindow_library::cleanupTestCase()
 {
-    delete mWindow;
+    delete m_window;
     pMainWindow = nullptr;
     APPEventFilter::release();
 }
 
 void tst_titlerwindow_library::request()
 {
-    mWindow->showTitlerWindow({_titler_paramter::CREATE_OR_EDIT, mFolder.toStdWString()});
+    m_window->showTitlerWindow({_titler_paramter::CREATE_OR_EDIT, m_folder.toStdWString()});
 }
 
 void tst_titlerwindow_library::randomSession()
 {
     const int steps = runLength("TITLER_STEPS", DEFAULT_STEPS);
     const RandomSeed seed(20261);
-    mRandom.seed(seed);
+    m_random.seed(seed);
     qInfo("seed %u", quint32(seed));
     QElapsedTimer timer;
     timer.start();
 
-    mFolder = mFixture.makeFolder("property");
-    LibraryFixture::fillFolder(mFolder, {"a", "b", "c"});
+    m_folder = m_fixture.makeFolder("property");
+    LibraryFixture::fillFolder(m_folder, {"a", "b", "c"});
     for (const char* stem : {"a", "b", "c"})
-        mModel.titles[stem].saved = textsOf(*read(stem));
+        m_model.titles[stem].saved = textsOf(*read(stem));
     request();
-    mModel.open({"a", "b", "c"});
-    QVERIFY2(verify(), qPrintable(mFailure));
+    m_model.open({"a", "b", "c"});
+    QVERIFY2(verify(), qPrintable(m_failure));
 
     for (int i = 1; i <= steps; ++i) {
         bool held = i % STEPS_OF_A_SESSION == 0 ? closeAndReopen() : step();
         held = held && (i % STEPS_BETWEEN_WAITS != 0 || waitForPictures()) && verify() &&
                (i % 100 != 0 || verifyFiles(true));
-        mLog << QStringLiteral("%1 (%2 of %3)").arg(mDoing, mModel.canvas).arg(i);
+        m_log << QStringLiteral("%1 (%2 of %3)").arg(m_doing, m_model.canvas).arg(i);
         if (!held) {
-            const qsizetype told = std::min<qsizetype>(mLog.size(), 30);
-            QFAIL(qPrintable(QStringLiteral("seed %1, step %2: %3\nthe last steps:\n%4\nthe stack: %5")
-                                 .arg(quint32(seed))
-                                 .arg(i)
-                                 .arg(mFailure, mLog.mid(mLog.size() - told).join('\n'), mModel.stack())));
+            const qsizetype told = std::min<qsizetype>(m_log.size(), 30);
+            QFAIL(
+                qPrintable(QStringLiteral("seed %1, step %2: %3\nthe last steps:\n%4\nthe stack: %5")
+                               .arg(quint32(seed))
+                               .arg(i)
+                               .arg(m_failure, m_log.mid(m_log.size() - told).join('\n'), m_model.stack())));
         }
     }
-    QVERIFY2(closeAndReopen() && verify() && verifyFiles(true) && verifyNotices(), qPrintable(mFailure));
-    mWindow->closeTitlerWindow();
-    QVERIFY(mComparedPictures > 0);
+    QVERIFY2(closeAndReopen() && verify() && verifyFiles(true) && verifyNotices(), qPrintable(m_failure));
+    m_window->closeTitlerWindow();
+    QVERIFY(m_comparedPictures > 0);
     qInfo("seed %u: %d steps, %d titles, %d dialogs, %d pictures compared, %lld ms", quint32(seed), steps,
-          int(mModel.titles.size()), mDialogs, mComparedPictures, static_cast<long long>(timer.elapsed()));
+          int(m_model.titles.size()), m_dialogs, m_comparedPictures, static_cast<long long>(timer.elapsed()));
 }
 
 bool tst_titlerwindow_library::step()
 {
     // Long runs of undo and redo reach both ends of the stack.
-    const int many = std::max(0, int(mModel.order.size()) - COMFORTABLE_COUNT);
+    const int many = std::max(0, int(m_model.order.size()) - COMFORTABLE_COUNT);
     const QList<QPair<int, bool (tst_titlerwindow_library::*)()>> actions{
         {26, &tst_titlerwindow_library::undoStep},
         {20, &tst_titlerwindow_library::redoStep},
@@ -307,30 +308,30 @@ bool tst_titlerwindow_library::step()
 
 bool tst_titlerwindow_library::takeCommands(int wanted)
 {
-    CHECK(std::exchange(mTextCommands, 0) == wanted);
+    CHECK(std::exchange(m_textCommands, 0) == wanted);
     return true;
 }
 
 bool tst_titlerwindow_library::leaveText(bool deleteBlank, const std::function<void()>& action)
 {
-    const bool isActive = mScene->itemIsEditorInteraction() || mScene->itemIsSelectionMode();
+    const bool isActive = m_scene->itemIsEditorInteraction() || m_scene->itemIsSelectionMode();
     action();
     int pushed = 0;
-    if (mPending) {
+    if (m_pending) {
         ++pushed;
-        const GraphicsText* item = mScene->findTextItem(mPending->getTextObjectID());
+        const GraphicsText* item = m_scene->findTextItem(m_pending->getTextObjectID());
         CHECK(item);
         const std::unique_ptr<TText> after(item->getTextList());
-        CHECK(QString::fromStdString(after->getText()) == mPendingText);
-        mModel.editText(*mPending, *after);
-        mPending.reset();
+        CHECK(QString::fromStdString(after->getText()) == m_pendingText);
+        m_model.editText(*m_pending, *after);
+        m_pending.reset();
     }
     if (isActive && deleteBlank) {
-        for (const int id : mModel.live.keys()) {
-            if (!mModel.live.value(id).getText().empty())
+        for (const int id : m_model.live.keys()) {
+            if (!m_model.live.value(id).getText().empty())
                 continue;
             ++pushed;
-            mModel.deleteText(id);
+            m_model.deleteText(id);
         }
     }
     return takeCommands(pushed);
@@ -339,160 +340,160 @@ bool tst_titlerwindow_library::leaveText(bool deleteBlank, const std::function<v
 bool tst_titlerwindow_library::choose(ArchiveAction::ARCHIVE_ACTION_TYPE type, int row)
 {
     if (!leaveText(true, [this, row] {
-            Q_EMIT mList->widgetItemRightPressed(mList->archiveItem(row), QPoint(300, 60), mList);
+            Q_EMIT m_list->widgetItemRightPressed(m_list->archiveItem(row), QPoint(300, 60), m_list);
         }))
         return false;
-    CHECK(mList->IsOptionMenuShowing());
-    ArchiveAction* action = mList->findChild<ArchiveMenu*>()->action(type);
+    CHECK(m_list->IsOptionMenuShowing());
+    ArchiveAction* action = m_list->findChild<ArchiveMenu*>()->action(type);
     CHECK(action->isEnabled());
-    mList->slotHideOptionMenu();
-    mList->selectOptionMenuItem(action);
+    m_list->slotHideOptionMenu();
+    m_list->selectOptionMenuItem(action);
     return takeCommands(0);
 }
 
 bool tst_titlerwindow_library::takeNewTitle(const LibraryModel::Texts& texts, int behind)
 {
-    const QString stem = stemOf(mList->getSelectedArchive());
+    const QString stem = stemOf(m_list->getSelectedArchive());
     CHECK(!stem.isEmpty());
-    CHECK(!mModel.titles.contains(stem));
-    mModel.paste(stem, texts, behind);
+    CHECK(!m_model.titles.contains(stem));
+    m_model.paste(stem, texts, behind);
     return true;
 }
 
 bool tst_titlerwindow_library::createTitle()
 {
-    const int row = random(8) == 0 || mModel.order.isEmpty() ? -1 : randomRow();
-    const bool isUser = !mTemplates.isEmpty() && random(3) == 0;
+    const int row = random(8) == 0 || m_model.order.isEmpty() ? -1 : randomRow();
+    const bool isUser = !m_templates.isEmpty() && random(3) == 0;
     const bool isCancelled = random(6) == 0;
     LibraryModel::Texts texts;
-    mInDialog = [this, isUser, isCancelled, &texts] {
-        TemplateTab* tab = isUser ? mPicker->userTab() : mPicker->presetTab();
-        mPicker->findChild<QTabWidget*>()->setCurrentIndex(isUser ? 1 : 0);
+    m_inDialog = [this, isUser, isCancelled, &texts] {
+        TemplateTab* tab = isUser ? m_picker->userTab() : m_picker->presetTab();
+        m_picker->findChild<QTabWidget*>()->setCurrentIndex(isUser ? 1 : 0);
         tab->select(tab->item(random(tab->count())));
-        texts = isUser ? mTemplates.value(TemplateTab::templateName(*tab->selectedArchive()))
+        texts = isUser ? m_templates.value(TemplateTab::templateName(*tab->selectedArchive()))
                        : textsOf(*tab->selectedArchive());
         if (!isCancelled)
-            mPicker->findChild<KSPushbutton*>(isUser ? "selectUserButton" : "selectPresetButton")->click();
+            m_picker->findChild<KSPushbutton*>(isUser ? "selectUserButton" : "selectPresetButton")->click();
     };
-    const int dialogs = mDialogs;
-    mDoing = QStringLiteral("create at %1%2").arg(row).arg(isCancelled ? " (cancelled)" : "");
+    const int dialogs = m_dialogs;
+    m_doing = QStringLiteral("create at %1%2").arg(row).arg(isCancelled ? " (cancelled)" : "");
     if (!choose(ArchiveAction::ACTION_CREATE, row))
         return false;
-    CHECK(mDialogs == dialogs + 1);
+    CHECK(m_dialogs == dialogs + 1);
     if (isCancelled)
         return true;
-    return takeNewTitle(texts, row < 0 ? int(mModel.order.size()) - 1 : row);
+    return takeNewTitle(texts, row < 0 ? int(m_model.order.size()) - 1 : row);
 }
 
 bool tst_titlerwindow_library::copyTitle()
 {
-    mDoing = "copy nothing";
-    if (mModel.order.isEmpty())
+    m_doing = "copy nothing";
+    if (m_model.order.isEmpty())
         return true;
     const int row = randomRow();
-    mDoing = QStringLiteral("copy %1").arg(mModel.order.at(row));
+    m_doing = QStringLiteral("copy %1").arg(m_model.order.at(row));
     if (!choose(ArchiveAction::ACTION_COPY, row))
         return false;
-    mCopy = mModel.titles.value(mModel.order.at(row)).saved;
+    m_copy = m_model.titles.value(m_model.order.at(row)).saved;
     return true;
 }
 
 bool tst_titlerwindow_library::pasteTitle()
 {
-    mDoing = "paste nothing";
-    if (!mCopy)
+    m_doing = "paste nothing";
+    if (!m_copy)
         return true;
-    const int row = random(8) == 0 || mModel.order.isEmpty() ? -1 : randomRow();
-    mDoing = QStringLiteral("paste at %1").arg(row);
+    const int row = random(8) == 0 || m_model.order.isEmpty() ? -1 : randomRow();
+    m_doing = QStringLiteral("paste at %1").arg(row);
     if (!choose(ArchiveAction::ACTION_PASTE, row))
         return false;
-    return takeNewTitle(*mCopy, row < 0 ? int(mModel.order.size()) - 1 : row);
+    return takeNewTitle(*m_copy, row < 0 ? int(m_model.order.size()) - 1 : row);
 }
 
 bool tst_titlerwindow_library::deleteTitle()
 {
-    mDoing = "delete nothing";
-    if (mModel.order.isEmpty())
+    m_doing = "delete nothing";
+    if (m_model.order.isEmpty())
         return true;
     const int row = randomRow();
-    mDoing = QStringLiteral("delete %1").arg(mModel.order.at(row));
+    m_doing = QStringLiteral("delete %1").arg(m_model.order.at(row));
     if (!choose(ArchiveAction::ACTION_DELETE, row))
         return false;
-    mModel.remove(mModel.order.at(row));
+    m_model.remove(m_model.order.at(row));
     return true;
 }
 
 bool tst_titlerwindow_library::saveAsTemplate()
 {
-    mDoing = "save nothing as template";
-    if (mModel.order.isEmpty())
+    m_doing = "save nothing as template";
+    if (m_model.order.isEmpty())
         return true;
     const int row = randomRow();
-    const QString stem = mModel.order.at(row);
+    const QString stem = m_model.order.at(row);
     // The title on the canvas is waited for by the second.
-    const bool waits = stem == mModel.selected && (mModel.pictureNeeded || mPending);
+    const bool waits = stem == m_model.selected && (m_model.pictureNeeded || m_pending);
     if (waits && random(5) != 0)
         return true;
-    mDoing = QStringLiteral("save %1 as template").arg(stem);
-    if (stem == mModel.selected && !waits && !waitForPictures())
+    m_doing = QStringLiteral("save %1 as template").arg(stem);
+    if (stem == m_model.selected && !waits && !waitForPictures())
         return false;
-    const int dialogs = mDialogs;
+    const int dialogs = m_dialogs;
     if (!choose(ArchiveAction::ACTION_ADD_USER, row))
         return false;
-    CHECK(mDialogs == dialogs + 1);
-    if (stem == mModel.selected)
-        mModel.leave();
-    const QString name = QStringLiteral("UserTemplate_%1").arg(++mTemplateNumber, 3, 10, QLatin1Char('0'));
+    CHECK(m_dialogs == dialogs + 1);
+    if (stem == m_model.selected)
+        m_model.leave();
+    const QString name = QStringLiteral("UserTemplate_%1").arg(++m_templateNumber, 3, 10, QLatin1Char('0'));
     Archive written;
-    CHECK(TitleParser().readOneTitle(mFixture.userTitle(name).toStdString(), &written) == 1);
-    mTemplates[name] = mModel.titles.value(stem).saved;
-    CHECK(LibraryModel::isSame(textsOf(written), mTemplates.value(name)));
-    CHECK(mPicker->userTab()->count() == mTemplates.size());
-    CHECK(mFixture.userOrder().last() == name);
+    CHECK(TitleParser().readOneTitle(m_fixture.userTitle(name).toStdString(), &written) == 1);
+    m_templates[name] = m_model.titles.value(stem).saved;
+    CHECK(LibraryModel::isSame(textsOf(written), m_templates.value(name)));
+    CHECK(m_picker->userTab()->count() == m_templates.size());
+    CHECK(m_fixture.userOrder().last() == name);
     return true;
 }
 
 bool tst_titlerwindow_library::moveTitle()
 {
-    mDoing = "move nothing";
-    if (mModel.order.isEmpty())
+    m_doing = "move nothing";
+    if (m_model.order.isEmpty())
         return true;
     const int from = randomRow();
     const int to = randomRow();
-    mDoing = QStringLiteral("move %1 to %2").arg(from).arg(to);
+    m_doing = QStringLiteral("move %1 to %2").arg(from).arg(to);
     if (!leaveText()) // with the Move button
         return false;
-    mWindow->editAndDoneButtonClicked();
-    CHECK(mWindow->archiveListIsMoveMode());
-    ArchiveItem* item = mList->archiveItem(from);
-    Q_EMIT mList->signalDragOneItem(item, from, mList);
-    mList->removeWidgetItem(item);
-    mList->addWidgetItem(item, to);
-    Q_EMIT mList->signalItemDrop();
-    mWindow->editAndDoneButtonClicked();
-    CHECK(!mWindow->archiveListIsMoveMode());
-    mModel.move(from, to);
+    m_window->editAndDoneButtonClicked();
+    CHECK(m_window->archiveListIsMoveMode());
+    ArchiveItem* item = m_list->archiveItem(from);
+    Q_EMIT m_list->signalDragOneItem(item, from, m_list);
+    m_list->removeWidgetItem(item);
+    m_list->addWidgetItem(item, to);
+    Q_EMIT m_list->signalItemDrop();
+    m_window->editAndDoneButtonClicked();
+    CHECK(!m_window->archiveListIsMoveMode());
+    m_model.move(from, to);
     return takeCommands(0);
 }
 
 bool tst_titlerwindow_library::focusTitle()
 {
-    mDoing = "focus nothing";
-    if (mModel.order.isEmpty())
+    m_doing = "focus nothing";
+    if (m_model.order.isEmpty())
         return true;
     const int row = randomRow();
-    mDoing = QStringLiteral("focus %1").arg(mModel.order.at(row));
+    m_doing = QStringLiteral("focus %1").arg(m_model.order.at(row));
     // The release over the list.
-    if (!leaveText(false, [this] { mWindow->hideSoftWareWithOutDeleteEmptyItems(); }))
+    if (!leaveText(false, [this] { m_window->hideSoftWareWithOutDeleteEmptyItems(); }))
         return false;
-    Q_EMIT mList->widgetItemReleased(mList->archiveItem(row), QPoint(300, 60), mList);
-    mModel.focus(mModel.order.at(row));
+    Q_EMIT m_list->widgetItemReleased(m_list->archiveItem(row), QPoint(300, 60), m_list);
+    m_model.focus(m_model.order.at(row));
     return takeCommands(0);
 }
 
 int tst_titlerwindow_library::randomTextId()
 {
-    const QList<int> ids = mModel.live.keys();
+    const QList<int> ids = m_model.live.keys();
     return ids.isEmpty() ? 0 : ids.at(random(int(ids.size())));
 }
 
@@ -502,28 +503,28 @@ void tst_titlerwindow_library::type(GraphicsText* item, const QString& text)
     QTextCursor cursor = item->textCursor();
     cursor.movePosition(QTextCursor::End);
     cursor.insertText(text);
-    mPendingText = item->toPlainText();
+    m_pendingText = item->toPlainText();
 }
 
 bool tst_titlerwindow_library::newText()
 {
-    mDoing = "new text";
+    m_doing = "new text";
     if (!leaveText())
         return false;
-    if (mModel.canvas.isEmpty() || mModel.live.size() >= CanvasScene::MAX_TEXT_OBJECTS)
+    if (m_model.canvas.isEmpty() || m_model.live.size() >= CanvasScene::MAX_TEXT_OBJECTS)
         return true;
     int id = 1;
-    while (mModel.live.contains(id))
+    while (m_model.live.contains(id))
         ++id;
-    mWindow->slotNewTextButtonClicked();
+    m_window->slotNewTextButtonClicked();
     if (!takeCommands(1))
         return false;
-    GraphicsText* item = mScene->findTextItem(id);
+    GraphicsText* item = m_scene->findTextItem(id);
     CHECK(item);
     const std::unique_ptr<TText> made(item->getTextList());
-    mModel.createText(*made);
-    type(item, QStringLiteral("新%1").arg(++mTyped));
-    mPending = *made;
+    m_model.createText(*made);
+    type(item, QStringLiteral("新%1").arg(++m_typed));
+    m_pending = *made;
     if (random(3) == 0)
         return true; // what comes next ends it
     return leaveText();
@@ -531,15 +532,15 @@ bool tst_titlerwindow_library::newText()
 
 bool tst_titlerwindow_library::editText()
 {
-    mDoing = "edit text";
+    m_doing = "edit text";
     if (!leaveText())
         return false;
     const int id = randomTextId();
     if (id == 0)
         return true;
-    GraphicsText* item = mScene->findTextItem(id);
+    GraphicsText* item = m_scene->findTextItem(id);
     CHECK(item);
-    mPending = mModel.live.value(id);
+    m_pending = m_model.live.value(id);
     type(item, QString(QChar('a' + random(26))));
     if (random(3) == 0)
         return true;
@@ -548,96 +549,96 @@ bool tst_titlerwindow_library::editText()
 
 bool tst_titlerwindow_library::moveText()
 {
-    mDoing = "move text";
+    m_doing = "move text";
     if (!leaveText())
         return false;
     const int id = randomTextId();
     if (id == 0)
         return true;
-    const QPointF from = LibraryModel::placeOf(mModel.live.value(id));
+    const QPointF from = LibraryModel::placeOf(m_model.live.value(id));
     const QPointF to(20 + random(1000), 20 + random(600));
     if (from == to)
         return true;
-    mScene->slotCreateMoveUndoCommand(id, from, to);
-    mModel.moveText(id, to);
+    m_scene->slotCreateMoveUndoCommand(id, from, to);
+    m_model.moveText(id, to);
     return takeCommands(1);
 }
 
 bool tst_titlerwindow_library::deleteText()
 {
-    mDoing = "delete text";
+    m_doing = "delete text";
     if (!leaveText())
         return false;
     const int id = randomTextId();
     if (id == 0)
         return true;
-    mScene->findTextItem(id)->changeItemToSolidLineState();
-    mWindow->pressDelectButton();
-    mModel.deleteText(id);
+    m_scene->findTextItem(id)->changeItemToSolidLineState();
+    m_window->pressDelectButton();
+    m_model.deleteText(id);
     return takeCommands(1);
 }
 
 bool tst_titlerwindow_library::undoStep()
 {
-    mDoing = "undo";
-    if (!leaveText(false, [this] { Q_EMIT mBar->undoButtonClicked(); }))
+    m_doing = "undo";
+    if (!leaveText(false, [this] { Q_EMIT m_bar->undoButtonClicked(); }))
         return false;
-    Q_EMIT mBar->exeUndoAction();
-    mModel.undo();
+    Q_EMIT m_bar->exeUndoAction();
+    m_model.undo();
     return takeCommands(0);
 }
 
 bool tst_titlerwindow_library::redoStep()
 {
-    mDoing = "redo";
-    if (!leaveText(false, [this] { Q_EMIT mBar->redoButtonClicked(); }))
+    m_doing = "redo";
+    if (!leaveText(false, [this] { Q_EMIT m_bar->redoButtonClicked(); }))
         return false;
-    Q_EMIT mBar->exeRedoAction();
-    mModel.redo();
+    Q_EMIT m_bar->exeRedoAction();
+    m_model.redo();
     return takeCommands(0);
 }
 
 bool tst_titlerwindow_library::closeAndReopen()
 {
-    mDoing = "close and reopen";
+    m_doing = "close and reopen";
     // Most of the times all is written already; else the window waits by the second.
     if (random(4) != 0 && (!focusTitle() || !waitForPictures()))
         return false;
-    if (!leaveText(false, [this] { mWindow->saveCurrentTitle(); }))
+    if (!leaveText(false, [this] { m_window->saveCurrentTitle(); }))
         return false;
-    mWindow->closeTitlerWindow();
-    mModel.leave();
-    CHECK(!mWindow->isVisible());
+    m_window->closeTitlerWindow();
+    m_model.leave();
+    CHECK(!m_window->isVisible());
     // Now that nothing can be brought back, the folder holds what the list held, and no picture beside it.
     QStringList stems;
-    for (const QString& file : QDir(mFolder).entryList(QDir::Files))
+    for (const QString& file : QDir(m_folder).entryList(QDir::Files))
         stems << file.section('_', 0, 0).section('.', 0, 0);
     stems.removeDuplicates();
-    QStringList listed = mModel.order;
+    QStringList listed = m_model.order;
     listed.sort();
     stems.sort();
     CHECK(stems == listed);
-    CHECK(mModel.order.isEmpty() || LibraryFixture::order(mFolder) == mModel.order);
-    mCopy.reset();
+    CHECK(m_model.order.isEmpty() || LibraryFixture::order(m_folder) == m_model.order);
+    m_copy.reset();
     LibraryModel::Texts texts;
-    if (mModel.order.isEmpty()) {
-        mInDialog = [this, &texts] {
-            TemplateTab* presets = mPicker->presetTab();
-            mPicker->findChild<QTabWidget*>()->setCurrentIndex(0);
+    if (m_model.order.isEmpty()) {
+        m_inDialog = [this, &texts] {
+            TemplateTab* presets = m_picker->presetTab();
+            m_picker->findChild<QTabWidget*>()->setCurrentIndex(0);
             presets->select(presets->item(0));
             texts = textsOf(*presets->selectedArchive());
-            mPicker->findChild<KSPushbutton*>("selectPresetButton")->click();
+            m_picker->findChild<KSPushbutton*>("selectPresetButton")->click();
         };
     }
-    const QStringList kept = mModel.order;
+    const QStringList kept = m_model.order;
     request();
-    mModel.open(kept);
+    m_model.open(kept);
     return !kept.isEmpty() || takeNewTitle(texts, -1);
 }
 
 bool tst_titlerwindow_library::waitForPictures()
 {
-    CHECK(QTest::qWaitFor([this] { return mScene->isEditFinish(); }, PATIENCE_MS));
+    CHECK(QTest::qWaitFor([this] { return m_scene->isEditFinish(); }, PATIENCE_MS));
     return true;
 }
 
@@ -651,46 +652,47 @@ std::unique_ptr<Archive> tst_titlerwindow_library::read(const QString& stem) con
 
 bool tst_titlerwindow_library::verify()
 {
-    CHECK(mList->count() == mModel.order.size());
-    for (int i = 0; i < mList->count(); ++i) {
-        const ArchiveItem* item = mList->archiveItem(i);
+    CHECK(m_list->count() == m_model.order.size());
+    for (int i = 0; i < m_list->count(); ++i) {
+        const ArchiveItem* item = m_list->archiveItem(i);
         const QString stem = stemOf(item);
-        CHECK(stem == mModel.order.at(i));
-        if (mPending && stem == mModel.canvas)
+        CHECK(stem == m_model.order.at(i));
+        if (m_pending && stem == m_model.canvas)
             continue; // not a step yet
-        if (!LibraryModel::isSame(textsOf(*item->getArchiveData()), mModel.titles.value(stem).saved)) {
-            mFailure = QStringLiteral("record of %1: %2 instead of %3")
-                           .arg(stem, describe(textsOf(*item->getArchiveData())),
-                                describe(mModel.titles.value(stem).saved));
+        if (!LibraryModel::isSame(textsOf(*item->getArchiveData()), m_model.titles.value(stem).saved)) {
+            m_failure = QStringLiteral("record of %1: %2 instead of %3")
+                            .arg(stem, describe(textsOf(*item->getArchiveData())),
+                                 describe(m_model.titles.value(stem).saved));
             return false;
         }
     }
-    CHECK(LibraryFixture::order(mFolder) == mModel.order);
-    CHECK(stemOf(mList->getSelectedArchive()) == mModel.selected);
-    CHECK((mScene->archive()
-               ? QFileInfo(QString::fromStdString(mScene->archive()->getPath())).completeBaseName()
-               : QString()) == mModel.canvas);
-    if (!mPending) {
+    CHECK(LibraryFixture::order(m_folder) == m_model.order);
+    CHECK(stemOf(m_list->getSelectedArchive()) == m_model.selected);
+    CHECK((m_scene->archive()
+               ? QFileInfo(QString::fromStdString(m_scene->archive()->getPath())).completeBaseName()
+               : QString()) == m_model.canvas);
+    if (!m_pending) {
         LibraryModel::Texts shown;
-        for (const GraphicsText* item : mScene->getTextItemList()) {
+        for (const GraphicsText* item : m_scene->getTextItemList()) {
             if (item->isEnabled()) {
                 const std::unique_ptr<TText> text(item->getTextList());
                 CHECK(!shown.contains(text->getTextObjectID()));
                 shown[text->getTextObjectID()] = *text;
             }
         }
-        if (!LibraryModel::isSame(shown, mModel.live)) {
-            mFailure = QStringLiteral("canvas: %1 instead of %2").arg(describe(shown), describe(mModel.live));
+        if (!LibraryModel::isSame(shown, m_model.live)) {
+            m_failure =
+                QStringLiteral("canvas: %1 instead of %2").arg(describe(shown), describe(m_model.live));
             return false;
         }
     }
-    for (auto title = mModel.titles.keyBegin(); title != mModel.titles.keyEnd(); ++title) {
+    for (auto title = m_model.titles.keyBegin(); title != m_model.titles.keyEnd(); ++title) {
         const bool isNew = EditContextController::getInstance()->isNewCreateFile(
             (*title + QStringLiteral(".xml")).toStdWString());
-        CHECK(isNew == mModel.context.contains(*title));
+        CHECK(isNew == m_model.context.contains(*title));
     }
-    CHECK(mUndo->isEnabled() == mModel.canUndo());
-    CHECK(mRedo->isEnabled() == mModel.canRedo());
+    CHECK(m_undo->isEnabled() == m_model.canUndo());
+    CHECK(m_redo->isEnabled() == m_model.canRedo());
     return verifyFiles(false) && verifyPictures();
 }
 
@@ -698,20 +700,20 @@ bool tst_titlerwindow_library::verify()
 // read.
 bool tst_titlerwindow_library::verifyFiles(bool all)
 {
-    for (const QString& stem : mModel.reachable()) {
-        if (mPending && stem == mModel.canvas)
+    for (const QString& stem : m_model.reachable()) {
+        if (m_pending && stem == m_model.canvas)
             continue;
         const Stamp stamp = Stamp::of(fileOf(stem));
-        if (!all && stamp.size >= 0 && stamp == mStamps.value(fileOf(stem)))
+        if (!all && stamp.size >= 0 && stamp == m_stamps.value(fileOf(stem)))
             continue;
         const auto archive = read(stem);
-        if (!archive || !LibraryModel::isSame(textsOf(*archive), mModel.titles.value(stem).saved)) {
-            mFailure = QStringLiteral("file of %1: %2 instead of %3")
-                           .arg(stem, archive ? describe(textsOf(*archive)) : "nothing",
-                                describe(mModel.titles.value(stem).saved));
+        if (!archive || !LibraryModel::isSame(textsOf(*archive), m_model.titles.value(stem).saved)) {
+            m_failure = QStringLiteral("file of %1: %2 instead of %3")
+                            .arg(stem, archive ? describe(textsOf(*archive)) : "nothing",
+                                 describe(m_model.titles.value(stem).saved));
             return false;
         }
-        mStamps[fileOf(stem)] = stamp;
+        m_stamps[fileOf(stem)] = stamp;
     }
     return true;
 }
@@ -719,37 +721,37 @@ bool tst_titlerwindow_library::verifyFiles(bool all)
 // Titles with the same texts have the same pictures, whichever way they came to them.
 bool tst_titlerwindow_library::verifyPictures()
 {
-    if (!mScene->isEditFinish())
+    if (!m_scene->isEditFinish())
         return true; // they are on their way
-    for (const QString& stem : std::as_const(mModel.order)) {
-        if (!mModel.hasCurrentPictures(stem))
+    for (const QString& stem : std::as_const(m_model.order)) {
+        if (!m_model.hasCurrentPictures(stem))
             continue;
         QByteArrayList sums;
         bool changed = false;
         for (const char* suffix : PICTURES) {
-            const QString path = mFolder + QLatin1Char('/') + stem + QLatin1String(suffix);
+            const QString path = m_folder + QLatin1Char('/') + stem + QLatin1String(suffix);
             const Stamp stamp = Stamp::of(path);
             CHECK(stamp.size > 0);
-            if (!(stamp == mStamps.value(path))) {
+            if (!(stamp == m_stamps.value(path))) {
                 QFile file(path);
                 CHECK(file.open(QIODevice::ReadOnly));
-                mPictureSums[path] = QCryptographicHash::hash(file.readAll(), QCryptographicHash::Sha1);
-                mStamps[path] = stamp;
+                m_pictureSums[path] = QCryptographicHash::hash(file.readAll(), QCryptographicHash::Sha1);
+                m_stamps[path] = stamp;
                 changed = true;
             }
-            sums << mPictureSums.value(path);
+            sums << m_pictureSums.value(path);
         }
         if (!changed)
             continue;
-        ++mComparedPictures;
-        const LibraryModel::Texts& texts = mModel.titles[stem].saved;
+        ++m_comparedPictures;
+        const LibraryModel::Texts& texts = m_model.titles[stem].saved;
         const auto known =
-            std::find_if(mKnownPictures.cbegin(), mKnownPictures.cend(),
+            std::find_if(m_knownPictures.cbegin(), m_knownPictures.cend(),
                          [&](const auto& entry) { return LibraryModel::isSame(entry.first, texts); });
-        if (known == mKnownPictures.cend()) {
-            mKnownPictures.append({texts, sums});
+        if (known == m_knownPictures.cend()) {
+            m_knownPictures.append({texts, sums});
         } else if (known->second != sums) {
-            mFailure = QStringLiteral("pictures of %1 do not show %2").arg(stem, describe(texts));
+            m_failure = QStringLiteral("pictures of %1 do not show %2").arg(stem, describe(texts));
             return false;
         }
     }
@@ -759,7 +761,7 @@ bool tst_titlerwindow_library::verifyPictures()
 // What the file manager was told adds up to what lies in the folder.
 bool tst_titlerwindow_library::verifyNotices()
 {
-    const QSet<QString> wanted(mModel.order.begin(), mModel.order.end());
+    const QSet<QString> wanted(m_model.order.begin(), m_model.order.end());
     const bool agree = QTest::qWaitFor([this, &wanted] { return toldTitles() == wanted; }, PATIENCE_MS);
     CHECK(agree);
     return true;
@@ -768,7 +770,7 @@ bool tst_titlerwindow_library::verifyNotices()
 QSet<QString> tst_titlerwindow_library::toldTitles() const
 {
     QSet<QString> stems{"a", "b", "c"};
-    for (QByteArray arguments : mSiblings.argumentsOf(FILE_MANAGER, UPDATE_TITLER_STATUS)) {
+    for (QByteArray arguments : m_siblings.argumentsOf(FILE_MANAGER, UPDATE_TITLER_STATUS)) {
         FileManagerDefine::tagTitleChangeStatusParam notice;
         FileManagerControllerParams::deserialize_updateTitlerStatus_param(notice, arguments.data(),
                                                                           long(arguments.size()));

@@ -118,59 +118,59 @@ private:
     QString lookAtDisk(bool withPictures);
     void fail(const QString& what);
     void report(qint64 milliseconds) const;
-    CanvasScene* scene() const { return mWindow->findChild<CanvasScene*>(); }
-    ArchiveList* list() const { return mWindow->findChild<ArchiveList*>(); }
-    FolderPicker* folders() const { return mWindow->findChild<FolderPicker*>(); }
-    TemplatePicker* templates() const { return mWindow->findChild<TemplatePicker*>(); }
+    CanvasScene* scene() const { return m_window->findChild<CanvasScene*>(); }
+    ArchiveList* list() const { return m_window->findChild<ArchiveList*>(); }
+    FolderPicker* folders() const { return m_window->findChild<FolderPicker*>(); }
+    TemplatePicker* templates() const { return m_window->findChild<TemplatePicker*>(); }
     template <class... Arguments>
     auto counting(const char* what)
     {
-        return [this, what](Arguments...) { ++mCounts[QLatin1String(what)]; };
+        return [this, what](Arguments...) { ++m_counts[QLatin1String(what)]; };
     }
 
-    MonkeyGround::DataInMemory mInMemory;
-    TemplateFixture mFiles;
-    TitleAccount mAccount{mFiles};
-    Siblings mSiblings;
-    SoftKeyboardStandIn mKeyboard;
-    Counts mCounts;
-    std::unique_ptr<OtherProcesses> mOthers;
-    std::unique_ptr<WindowFingers> mFingers;
-    TitlerWindow* mWindow = nullptr;
-    TouchDevice mDevice;
-    QEventLoop* mLoop = nullptr;
-    QString mFailure;
-    QStringList mDoings;
-    quint32 mSeed = 0;
-    int mTouches = 0;
-    int mNextGlance = 0;
-    int mNextLook = 0;
-    int mLooks = 0;
+    MonkeyGround::DataInMemory m_inMemory;
+    TemplateFixture m_files;
+    TitleAccount m_account{m_files};
+    Siblings m_siblings;
+    SoftKeyboardStandIn m_keyboard;
+    Counts m_counts;
+    std::unique_ptr<OtherProcesses> m_others;
+    std::unique_ptr<WindowFingers> m_fingers;
+    TitlerWindow* m_window = nullptr;
+    TouchDevice m_device;
+    QEventLoop* m_loop = nullptr;
+    QString m_failure;
+    QStringList m_doings;
+    quint32 m_seed = 0;
+    int m_touches = 0;
+    int m_nextGlance = 0;
+    int m_nextLook = 0;
+    int m_looks = 0;
 };
 
 void tst_titlerwindow_monkey::initTestCase()
 {
-    mSeed = RandomSeed(DEFAULT_SEED);
-    mTouches = runLength("TITLER_TOUCHES", DEFAULT_TOUCHES);
-    qInfo("seed %u, %d touches", mSeed, mTouches);
+    m_seed = RandomSeed(DEFAULT_SEED);
+    m_touches = runLength("TITLER_TOUCHES", DEFAULT_TOUCHES);
+    qInfo("seed %u, %d touches", m_seed, m_touches);
     MonkeyGround::showErrorsOnly();
     QLoggingCategory::setFilterRules(QStringLiteral("*.debug=false"));
-    QVERIFY(mSiblings.listenOnFreePorts());
-    mFiles.resetTemplates();
-    mFiles.makePresets("templates_en", {"lower", "strap", QString::fromUtf8("速報")}, true);
-    mFiles.makePresets("templates_chs", {"xia", QString::fromUtf8("快讯")}, true);
-    mFiles.makeUserTemplates(5);
+    QVERIFY(m_siblings.listenOnFreePorts());
+    m_files.resetTemplates();
+    m_files.makePresets("templates_en", {"lower", "strap", QString::fromUtf8("速報")}, true);
+    m_files.makePresets("templates_chs", {"xia", QString::fromUtf8("快讯")}, true);
+    m_files.makeUserTemplates(5);
     makeFolders();
-    mWindow = makeWaitingWindow();
-    KSInputContext::instance()->setKeyBoardController(&mKeyboard);
+    m_window = makeWaitingWindow();
+    KSInputContext::instance()->setKeyBoardController(&m_keyboard);
     EditContextController::getInstance()->resultCallBack(
         new FakeTitlerCallBack([this](const _CALLBACK_TITLER_PARAMTER& param) {
-            ++mCounts[QStringLiteral("answers to the asker")];
-            mCounts[QStringLiteral("titles in answers")] += param.count;
+            ++m_counts[QStringLiteral("answers to the asker")];
+            m_counts[QStringLiteral("titles in answers")] += param.count;
         }));
-    mOthers = std::make_unique<OtherProcesses>(mSiblings, mFiles, mAccount, mCounts, mSeed + 1);
-    mFingers = std::make_unique<WindowFingers>(*mWindow, mDevice, mSeed, mKeyboard, *mOthers,
-                                               mFiles.titleRoot(), mCounts);
+    m_others = std::make_unique<OtherProcesses>(m_siblings, m_files, m_account, m_counts, m_seed + 1);
+    m_fingers = std::make_unique<WindowFingers>(*m_window, m_device, m_seed, m_keyboard, *m_others,
+                                                m_files.titleRoot(), m_counts);
     countWhatHappens();
     countFolderEdits();
 }
@@ -179,7 +179,7 @@ void tst_titlerwindow_monkey::cleanupTestCase()
 {
     MonkeyGround::Application::instance()->frozen = false;
     KSInputContext::instance()->setKeyBoardController(nullptr);
-    delete mWindow;
+    delete m_window;
     pMainWindow = nullptr;
     APPEventFilter::release();
 }
@@ -193,7 +193,7 @@ void tst_titlerwindow_monkey::makeFolders()
     QStringList stems{QStringLiteral("first"), QString::fromUtf8("人名"), QString::fromUtf8("속보"),
                       QString::fromUtf8("ひと"), QStringLiteral("last")};
     for (const QString& name : names) {
-        const QString folder = mFiles.makeFolder(name);
+        const QString folder = m_files.makeFolder(name);
         if (name == names.last())
             for (int i = int(stems.size()); i < 99; ++i)
                 stems.append(QStringLiteral("%1").arg(i, 3, 10, QLatin1Char('0')));
@@ -210,17 +210,17 @@ void tst_titlerwindow_monkey::countWhatHappens()
     connect(list(), &ArchiveList::focusCommandSignal, this, counting<QUndoCommand*>("titles focused"));
     connect(list(), &ArchiveList::addUserSignal, this, counting<QString>("templates saved"));
     connect(folders(), &FolderPicker::changeFolderPath, this, counting<QString>("folders opened"));
-    const auto* bar = mWindow->findChild<ToolsBar*>();
+    const auto* bar = m_window->findChild<ToolsBar*>();
     connect(bar, &ToolsBar::closeButtonClick, this, counting<>("closes"));
     connect(list(), &ArchiveList::deleteCommandSignal, this, counting<QUndoCommand*>("titles deleted"));
-    for (const QAction* action : mFingers->undoAndRedo()) {
+    for (const QAction* action : m_fingers->undoAndRedo()) {
         const char* what = action->text().startsWith(QLatin1String("Undo")) ? "undo" : "redo";
         connect(action, &QAction::triggered, this, counting<bool>(what));
     }
     // A title that was deleted is to go, and one that was made can be taken back.
     const auto mayGo = [this](const ArchiveItem* item) {
         const QFileInfo file(item ? item->getArchiveDataPath() : QString());
-        mAccount.titleMayGo(file.path(), file.completeBaseName());
+        m_account.titleMayGo(file.path(), file.completeBaseName());
     };
     connect(list(), &ArchiveList::deleteCommandSignal, this,
             [this, mayGo] { mayGo(list()->getCurrentOperationArchive()); });
@@ -235,28 +235,28 @@ void tst_titlerwindow_monkey::countFolderEdits()
     const FolderPicker* picker = folders();
     connect(picker->treeView()->treeDelegate(), &CustomTreeDelegete::signalLineEditCommitted, this,
             [this, picker](const QString& name) {
-                if (!QFileInfo(mFiles.titleRoot() + '/' + name).isDir())
+                if (!QFileInfo(m_files.titleRoot() + '/' + name).isDir())
                     return;
                 if (picker->editAction() == FolderPicker::FOLDER_EDIT_CREATE)
-                    ++mCounts["folders made"];
+                    ++m_counts["folders made"];
                 else if (picker->editAction() == FolderPicker::FOLDER_EDIT_RENAME)
-                    ++mCounts["folders renamed"];
+                    ++m_counts["folders renamed"];
                 else if (picker->editAction() == FolderPicker::FOLDER_EDIT_DUPLICATE)
-                    ++mCounts["folders duplicated"];
+                    ++m_counts["folders duplicated"];
             });
 }
 
 bool tst_titlerwindow_monkey::eventFilter(QObject* object, QEvent* event)
 {
     if (event->type() == QEvent::Show && object->isWidgetType() && static_cast<QWidget*>(object)->isWindow())
-        ++mCounts[QLatin1String(object->metaObject()->className()) + QStringLiteral(" shown")];
+        ++m_counts[QLatin1String(object->metaObject()->className()) + QStringLiteral(" shown")];
     return false;
 }
 
 // The fingers play at every turn of the event loop, and so in the loop of each dialog that they open.
 void tst_titlerwindow_monkey::turn()
 {
-    if (mFailure.isEmpty() && !isEnough())
+    if (m_failure.isEmpty() && !isEnough())
         play();
     else
         stop();
@@ -265,44 +265,44 @@ void tst_titlerwindow_monkey::turn()
 // Where everything is to happen, what is rare is waited for.
 bool tst_titlerwindow_monkey::isEnough() const
 {
-    const int touches = mFingers->touches();
-    return touches >= mTouches &&
-           (mTouches < TOUCHES_FOR_ALL || touches >= mTouches * MOST_ROUNDS || missed().isEmpty());
+    const int touches = m_fingers->touches();
+    return touches >= m_touches &&
+           (m_touches < TOUCHES_FOR_ALL || touches >= m_touches * MOST_ROUNDS || missed().isEmpty());
 }
 
 QStringList tst_titlerwindow_monkey::missed() const
 {
     QStringList missed;
     for (const char* what : MUST_HAPPEN)
-        if (mCounts.value(QLatin1String(what)) == 0)
+        if (m_counts.value(QLatin1String(what)) == 0)
             missed.append(QLatin1String(what));
     return missed;
 }
 
 void tst_titlerwindow_monkey::play()
 {
-    for (int i = 0; i < TOUCHES_PER_FRAME && mFailure.isEmpty(); ++i) {
+    for (int i = 0; i < TOUCHES_PER_FRAME && m_failure.isEmpty(); ++i) {
         const QWidget* dialog = QApplication::activeModalWidget();
-        const bool isHidden = mWindow->isHidden();
-        mFingers->step();
-        if (!mFailure.isEmpty())
+        const bool isHidden = m_window->isHidden();
+        m_fingers->step();
+        if (!m_failure.isEmpty())
             return;
-        if (!mFingers->isTouching()) {
+        if (!m_fingers->isTouching()) {
             if (const QString held = MonkeyGround::heldLocks(); !held.isEmpty())
                 return fail(held);
         }
-        if (mFingers->touches() >= mNextGlance) {
-            mNextGlance = mFingers->touches() + TOUCHES_PER_GLANCE;
+        if (m_fingers->touches() >= m_nextGlance) {
+            m_nextGlance = m_fingers->touches() + TOUCHES_PER_GLANCE;
             if (const QString wrong = glance(); !wrong.isEmpty())
                 return fail(wrong);
         }
-        if (mFingers->touches() >= mNextLook) {
-            mNextLook = mFingers->touches() + TOUCHES_PER_LOOK;
-            if (const QString wrong = lookAtDisk(++mLooks % LOOKS_PER_PICTURE == 0); !wrong.isEmpty())
+        if (m_fingers->touches() >= m_nextLook) {
+            m_nextLook = m_fingers->touches() + TOUCHES_PER_LOOK;
+            if (const QString wrong = lookAtDisk(++m_looks % LOOKS_PER_PICTURE == 0); !wrong.isEmpty())
                 return fail(wrong);
         }
         // A dialog that has closed must get its turn to end.
-        if (dialog != QApplication::activeModalWidget() || isHidden != mWindow->isHidden())
+        if (dialog != QApplication::activeModalWidget() || isHidden != m_window->isHidden())
             return;
     }
 }
@@ -310,21 +310,21 @@ void tst_titlerwindow_monkey::play()
 // One dialog after the other ends, and then the loop that all began in.
 void tst_titlerwindow_monkey::stop()
 {
-    mFingers->end();
+    m_fingers->end();
     if (QApplication::activeModalWidget() == templates() && templates()->isVisible())
         templates()->reject();
     else if (folders()->isVisible())
         folders()->done(QDialog::Rejected);
     else
-        mLoop->quit();
+        m_loop->quit();
 }
 
 void tst_titlerwindow_monkey::fail(const QString& what)
 {
-    mFailure = QString("seed %1, touch %2: %3\nthe last touches:\n%4")
-                   .arg(mSeed)
-                   .arg(mFingers->touches())
-                   .arg(what, mFingers->lastTouches().join('\n'));
+    m_failure = QString("seed %1, touch %2: %3\nthe last touches:\n%4")
+                    .arg(m_seed)
+                    .arg(m_fingers->touches())
+                    .arg(what, m_fingers->lastTouches().join('\n'));
 }
 
 // What holds at any moment.
@@ -336,7 +336,7 @@ QString tst_titlerwindow_monkey::glance() const
     for (const GraphicsText* text : texts)
         if (!inStep(*text))
             return "out of step: " + text->toPlainText();
-    if (mWindow->isHidden() && (folders()->isVisible() || templates()->isVisible()))
+    if (m_window->isHidden() && (folders()->isVisible() || templates()->isVisible()))
         return QStringLiteral("a dialog of a hidden window shows");
     return list()->getMoveState() ? QString() : glanceAtList();
 }
@@ -370,17 +370,17 @@ QString tst_titlerwindow_monkey::glanceAtList() const
 
 QString tst_titlerwindow_monkey::lookAtDisk(bool withPictures)
 {
-    return mAccount.look(withPictures);
+    return m_account.look(withPictures);
 }
 
 void tst_titlerwindow_monkey::report(qint64 milliseconds) const
 {
-    fprintf(stderr, "seed %u: %d touches in %.1f s, checksum %08x\n", mSeed, mFingers->touches(),
-            double(milliseconds) / 1000, mFingers->checksum());
-    for (auto count = mCounts.begin(); count != mCounts.end(); ++count)
+    fprintf(stderr, "seed %u: %d touches in %.1f s, checksum %08x\n", m_seed, m_fingers->touches(),
+            double(milliseconds) / 1000, m_fingers->checksum());
+    for (auto count = m_counts.begin(); count != m_counts.end(); ++count)
         fprintf(stderr, "%7d %s\n", count.value(), qPrintable(count.key()));
-    fprintf(stderr, "%7d titles and %d pictures read, %d titles in %d folders left\n", mAccount.titlesRead(),
-            mAccount.picturesRead(), mAccount.titlesNow(), int(mOthers->folders().size()));
+    fprintf(stderr, "%7d titles and %d pictures read, %d titles in %d folders left\n", m_account.titlesRead(),
+            m_account.picturesRead(), m_account.titlesNow(), int(m_others->folders().size()));
 }
 
 void tst_titlerwindow_monkey::manyTouches()
@@ -389,7 +389,7 @@ void tst_titlerwindow_monkey::manyTouches()
     clock.start();
     QCOMPARE(lookAtDisk(true), QString());
     QEventLoop loop;
-    mLoop = &loop;
+    m_loop = &loop;
     // Something to read at every turn.
     const int always = ::eventfd(1, EFD_CLOEXEC);
     QVERIFY(always >= 0);
@@ -402,21 +402,21 @@ void tst_titlerwindow_monkey::manyTouches()
     }
     ::close(always);
     report(clock.elapsed());
-    QVERIFY2(mFailure.isEmpty(), qPrintable(mFailure));
+    QVERIFY2(m_failure.isEmpty(), qPrintable(m_failure));
     const QString held = MonkeyGround::heldLocks();
-    QVERIFY2(held.isEmpty(), qPrintable(held + '\n' + mFingers->lastTouches().join('\n')));
+    QVERIFY2(held.isEmpty(), qPrintable(held + '\n' + m_fingers->lastTouches().join('\n')));
 
-    if (mWindow->isVisible()) {
-        QTRY_VERIFY(mWindow->dataSaveIsFinished());
-        mWindow->closeTitlerWindow();
-        if (mWindow->isVisible())
-            mWindow->continueCloseTitler({1, MessageDefine::CLOSE_OK, MessageDef::MESSAGE_CONFIRM_CLOSE});
-        QVERIFY(!mWindow->isVisible());
+    if (m_window->isVisible()) {
+        QTRY_VERIFY(m_window->dataSaveIsFinished());
+        m_window->closeTitlerWindow();
+        if (m_window->isVisible())
+            m_window->continueCloseTitler({1, MessageDefine::CLOSE_OK, MessageDef::MESSAGE_CONFIRM_CLOSE});
+        QVERIFY(!m_window->isVisible());
     }
     QVERIFY(FileSyncQueue::flush(std::chrono::seconds(60)));
     const QString wrong = lookAtDisk(true);
     QVERIFY2(wrong.isEmpty(), qPrintable(wrong));
-    if (mTouches >= TOUCHES_FOR_ALL)
+    if (m_touches >= TOUCHES_FOR_ALL)
         QCOMPARE(missed().join(", "), QString());
 }
 

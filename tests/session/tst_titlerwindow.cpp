@@ -51,17 +51,17 @@ class ShowCounter : public QObject
 {
 public:
     explicit ShowCounter(QObject* window) { window->installEventFilter(this); }
-    int count() const { return mCount; }
+    int count() const { return m_count; }
 
 protected:
     bool eventFilter(QObject* /*watched*/, QEvent* event) override
     {
-        mCount += event->type() == QEvent::Show ? 1 : 0;
+        m_count += event->type() == QEvent::Show ? 1 : 0;
         return false;
     }
 
 private:
-    int mCount = 0;
+    int m_count = 0;
 };
 
 } // namespace
@@ -103,30 +103,30 @@ private:
     QString writeTitle(const QString& folder, const QString& stem);
     QString writeFolder(const QString& name, const QStringList& stems);
     void request(const QString& path, int mode = _titler_paramter::CREATE_OR_EDIT);
-    ArchiveList* list() const { return mWindow->findChild<ArchiveList*>(); }
-    CanvasScene* scene() const { return mWindow->findChild<CanvasScene*>(); }
+    ArchiveList* list() const { return m_window->findChild<ArchiveList*>(); }
+    CanvasScene* scene() const { return m_window->findChild<CanvasScene*>(); }
 
-    LibraryFixture mFiles;
-    Siblings mSiblings;
-    LogFixture mLog;
-    TouchDevice mDevice;
-    TitlerWindow* mWindow = nullptr;
+    LibraryFixture m_files;
+    Siblings m_siblings;
+    LogFixture m_log;
+    TouchDevice m_device;
+    TitlerWindow* m_window = nullptr;
 };
 
 void tst_titlerwindow::initTestCase()
 {
-    QVERIFY(mSiblings.listenOnFreePorts());
+    QVERIFY(m_siblings.listenOnFreePorts());
     APPEventFilter::instance();
     Q_INIT_RESOURCE(UILibrary);
     Q_INIT_RESOURCE(TitlerToolResource);
-    mWindow = new TitlerWindow(true, nullptr);
-    pMainWindow = mWindow;
-    mWindow->setRealClose(false);
+    m_window = new TitlerWindow(true, nullptr);
+    pMainWindow = m_window;
+    m_window->setRealClose(false);
 }
 
 void tst_titlerwindow::cleanupTestCase()
 {
-    delete mWindow;
+    delete m_window;
     pMainWindow = nullptr;
     APPEventFilter::release();
 }
@@ -135,9 +135,9 @@ void tst_titlerwindow::cleanup()
 {
     EditContextController::getInstance()->setITitlerNoCallBack();
     EditContextController::getInstance()->resultCallBack(nullptr);
-    if (mWindow->isVisible())
-        mWindow->closeTitlerWindow();
-    QVERIFY(!mWindow->isVisible());
+    if (m_window->isVisible())
+        m_window->closeTitlerWindow();
+    QVERIFY(!m_window->isVisible());
 }
 
 QString tst_titlerwindow::writeTitle(const QString& folder, const QString& stem)
@@ -167,7 +167,7 @@ QString tst_titlerwindow::writeTitle(const QString& folder, const QString& stem)
 
 QString tst_titlerwindow::writeFolder(const QString& name, const QStringList& stems)
 {
-    const QString folder = mFiles.makeFolder(name);
+    const QString folder = m_files.makeFolder(name);
     QList<ArchiveOrder*> rows;
     for (const QString& stem : stems) {
         writeTitle(folder, stem);
@@ -182,23 +182,23 @@ QString tst_titlerwindow::writeFolder(const QString& name, const QStringList& st
 
 void tst_titlerwindow::request(const QString& path, int mode)
 {
-    mWindow->showTitlerWindow({mode, path.toStdWString()});
+    m_window->showTitlerWindow({mode, path.toStdWString()});
 }
 
 void tst_titlerwindow::hiddenAfterStart()
 {
-    QVERIFY(!mWindow->isVisible());
-    QVERIFY(!mWindow->windowIsVisible());
+    QVERIFY(!m_window->isVisible());
+    QVERIFY(!m_window->windowIsVisible());
 }
 
 void tst_titlerwindow::layoutOfTheCanvas()
 {
     request(writeFolder("layout", {"t1"}));
-    auto* view = mWindow->findChild<GraphicsView*>();
-    QCOMPARE(QRect(view->mapTo(mWindow, QPoint(0, 0)), view->size()), QRect(609, 97, 1280, 720));
-    QCOMPARE(mWindow->size(), QSize(1920, 1080));
+    auto* view = m_window->findChild<GraphicsView*>();
+    QCOMPARE(QRect(view->mapTo(m_window, QPoint(0, 0)), view->size()), QRect(609, 97, 1280, 720));
+    QCOMPARE(m_window->size(), QSize(1920, 1080));
     QCOMPARE(list()->size(), QSize(549, 997));
-    QVERIFY(mWindow->windowIsVisible());
+    QVERIFY(m_window->windowIsVisible());
 }
 
 void tst_titlerwindow::folderRequestShowsItsTitles()
@@ -228,9 +228,9 @@ void tst_titlerwindow::secondRequestIsDropped()
 
 void tst_titlerwindow::missingPathIsNeverShown()
 {
-    const ShowCounter shows(mWindow);
-    request(mFiles.titleRoot() + "/nowhere");
-    QVERIFY(!mWindow->isVisible());
+    const ShowCounter shows(m_window);
+    request(m_files.titleRoot() + "/nowhere");
+    QVERIFY(!m_window->isVisible());
     QCOMPARE(shows.count(), 0);
 }
 
@@ -252,39 +252,39 @@ void tst_titlerwindow::pathsOutsideAreNeverShown_data()
 void tst_titlerwindow::pathsOutsideAreNeverShown()
 {
     QFETCH(QString, path);
-    const QString data = QFileInfo(QFileInfo(mFiles.titleRoot()).path()).path();
+    const QString data = QFileInfo(QFileInfo(m_files.titleRoot()).path()).path();
     writeFolder("news", {"t1"});
-    for (const QString& folder : {data + "/elsewhere/foreign", mFiles.titleRoot() + " 2/foreign"}) {
+    for (const QString& folder : {data + "/elsewhere/foreign", m_files.titleRoot() + " 2/foreign"}) {
         QDir(folder).removeRecursively();
         QVERIFY(QDir().mkpath(folder));
         for (const char* stem : {"t1", "t2", "t3"})
             writeTitle(folder, stem);
         LibraryFixture::writeOrder(folder, {"t1"}); // the others would be cleaned up at Close
     }
-    QFile::remove(mFiles.titleRoot() + "/link");
-    QVERIFY(QFile::link(data + "/elsewhere/foreign", mFiles.titleRoot() + "/link"));
-    QFile::remove(mFiles.titleRoot() + "/news/link.xml");
-    QVERIFY(QFile::link(data + "/elsewhere/foreign/t2.xml", mFiles.titleRoot() + "/news/link.xml"));
+    QFile::remove(m_files.titleRoot() + "/link");
+    QVERIFY(QFile::link(data + "/elsewhere/foreign", m_files.titleRoot() + "/link"));
+    QFile::remove(m_files.titleRoot() + "/news/link.xml");
+    QVERIFY(QFile::link(data + "/elsewhere/foreign/t2.xml", m_files.titleRoot() + "/news/link.xml"));
     QFile::remove(data + "/elsewhere/ours.xml");
-    QVERIFY(QFile::link(mFiles.titleRoot() + "/news/t1.xml", data + "/elsewhere/ours.xml"));
-    mLog.takeDebugLines();
-    const ShowCounter shows(mWindow);
-    request(path.replace("%1", data).replace("%2", mFiles.titleRoot()));
-    QVERIFY(!mWindow->isVisible());
+    QVERIFY(QFile::link(m_files.titleRoot() + "/news/t1.xml", data + "/elsewhere/ours.xml"));
+    m_log.takeDebugLines();
+    const ShowCounter shows(m_window);
+    request(path.replace("%1", data).replace("%2", m_files.titleRoot()));
+    QVERIFY(!m_window->isVisible());
     QCOMPARE(shows.count(), 0);
     QVERIFY(list()->getCurrentPath().isEmpty());
-    QCOMPARE(mLog.takeDebugLines("ConfinedPath"),
+    QCOMPARE(m_log.takeDebugLines("ConfinedPath"),
              QStringList("400: Refused, a request asks for what lies outside: " + path));
     QCOMPARE(QDir(data + "/elsewhere/foreign").entryList({"*.xml"}, QDir::Files).size(), 3);
-    QFile::remove(mFiles.titleRoot() + "/link");
+    QFile::remove(m_files.titleRoot() + "/link");
 }
 
 void tst_titlerwindow::closeHidesAndEmpties()
 {
     request(writeFolder("closing", {"t1"}));
-    QMetaObject::invokeMethod(mWindow->findChild<ToolsBar*>(), "closeButtonClick");
-    QVERIFY(!mWindow->isVisible());
-    QVERIFY(!mWindow->windowIsVisible());
+    QMetaObject::invokeMethod(m_window->findChild<ToolsBar*>(), "closeButtonClick");
+    QVERIFY(!m_window->isVisible());
+    QVERIFY(!m_window->windowIsVisible());
     QVERIFY(list()->getCurrentPath().isEmpty());
     QVERIFY(scene()->getTextItemList().isEmpty());
 }
@@ -300,40 +300,40 @@ void tst_titlerwindow::closeWithNewFilesAsksFirst()
     request(writeFolder("asking", {"t1"}));
     EditContextController::getInstance()->resultCallBack(new Silent);
     EditContextController::getInstance()->insertFilePath(L"new.xml");
-    mWindow->closeTitlerWindow();
-    QVERIFY(mWindow->isVisible());
-    mWindow->continueCloseTitler({1, MessageDefine::CLOSE_OK, MessageDef::MESSAGE_CONFIRM_CLOSE});
-    QVERIFY(!mWindow->isVisible());
+    m_window->closeTitlerWindow();
+    QVERIFY(m_window->isVisible());
+    m_window->continueCloseTitler({1, MessageDefine::CLOSE_OK, MessageDef::MESSAGE_CONFIRM_CLOSE});
+    QVERIFY(!m_window->isVisible());
 }
 
 // The touch that closes goes to all fingers, in no certain order.
 void tst_titlerwindow::closeWhileFingersRestOnTitles()
 {
     const QString folder = writeFolder("fingers", {"t1", "t2", "t3", "t4", "t5"});
-    const auto* close = mWindow->findChild<ToolsBar*>()->findChild<KSPushbutton*>(QStringLiteral("Close"));
-    const QPoint onClose = close->mapTo(mWindow, close->rect().center());
+    const auto* close = m_window->findChild<ToolsBar*>()->findChild<KSPushbutton*>(QStringLiteral("Close"));
+    const QPoint onClose = close->mapTo(m_window, close->rect().center());
     for (int session = 0; session < 4; ++session) {
         request(folder);
-        QVERIFY(QTest::qWaitForWindowExposed(mWindow, PATIENCE_MS));
+        QVERIFY(QTest::qWaitForWindowExposed(m_window, PATIENCE_MS));
         QCOMPARE(list()->count(), 5);
         const QPointer<ArchiveItem> item = list()->archiveItem(0);
-        QWindow* window = mWindow->windowHandle();
-        QTest::touchEvent(window, mDevice).press(0, onClose, window);
-        auto down = QTest::touchEvent(window, mDevice, false);
-        auto up = QTest::touchEvent(window, mDevice, false);
-        auto gone = QTest::touchEvent(window, mDevice, false);
+        QWindow* window = m_window->windowHandle();
+        QTest::touchEvent(window, m_device).press(0, onClose, window);
+        auto down = QTest::touchEvent(window, m_device, false);
+        auto up = QTest::touchEvent(window, m_device, false);
+        auto gone = QTest::touchEvent(window, m_device, false);
         down.stationary(0);
         up.release(0, onClose, window);
         for (int i = 0; i < 5; ++i) {
-            const QPoint onTitle = list()->archiveItem(i)->mapTo(mWindow, QPoint(60, 60));
+            const QPoint onTitle = list()->archiveItem(i)->mapTo(m_window, QPoint(60, 60));
             down.press(1 + i, onTitle, window);
             up.stationary(1 + i);
             gone.release(1 + i, onTitle, window);
         }
         down.commit();
-        QVERIFY(mWindow->isVisible());
+        QVERIFY(m_window->isVisible());
         up.commit();
-        QVERIFY(!mWindow->isVisible());
+        QVERIFY(!m_window->isVisible());
         QTRY_VERIFY(!item);
         gone.commit();
     }
@@ -342,8 +342,8 @@ void tst_titlerwindow::closeWhileFingersRestOnTitles()
 void tst_titlerwindow::otherMessagesDoNotClose()
 {
     request(writeFolder("others", {"t1"}));
-    mWindow->continueCloseTitler({1, MessageDefine::CLOSE_OK, MessageDef::MESSAGE_FONT_MISSING});
-    QVERIFY(mWindow->isVisible());
+    m_window->continueCloseTitler({1, MessageDefine::CLOSE_OK, MessageDef::MESSAGE_FONT_MISSING});
+    QVERIFY(m_window->isVisible());
 }
 
 void tst_titlerwindow::createSessionAnswersInFolderOrder()
@@ -374,8 +374,8 @@ void tst_titlerwindow::createSessionAnswersInFolderOrder()
     list()->createArchiveFromTemplate(&blank);
     QTest::qWait(2); // names are made of the time in milliseconds
     list()->createArchiveFromTemplate(&blank);
-    mWindow->closeTitlerWindow();
-    QVERIFY(!mWindow->isVisible());
+    m_window->closeTitlerWindow();
+    QVERIFY(!m_window->isVisible());
     QCOMPARE(result.calls, 1);
     QCOMPARE(result.count, 2);
     QCOMPARE(QString::fromStdWString(result.path), folder);
@@ -388,42 +388,42 @@ void tst_titlerwindow::focusCommandLeavesACleanStackClean()
         int id() const override { return 1; }
     };
     QAction* undo = nullptr;
-    for (QAction* action : mWindow->findChildren<QAction*>(QString(), Qt::FindDirectChildrenOnly))
+    for (QAction* action : m_window->findChildren<QAction*>(QString(), Qt::FindDirectChildrenOnly))
         if (action->text().startsWith("Undo"))
             undo = action;
     QVERIFY(undo);
-    mWindow->pushUndoStack(new Focus);
+    m_window->pushUndoStack(new Focus);
     QVERIFY(!undo->isEnabled());
-    mWindow->pushUndoStack(new QUndoCommand);
+    m_window->pushUndoStack(new QUndoCommand);
     QVERIFY(undo->isEnabled());
-    mWindow->clearUndoStack();
+    m_window->clearUndoStack();
     QVERIFY(!undo->isEnabled());
 }
 
 void tst_titlerwindow::moveModeEatsPressesOutsideTheList()
 {
     request(writeFolder("moving", {"t1"}));
-    QVERIFY(QTest::qWaitForWindowExposed(mWindow, PATIENCE_MS));
+    QVERIFY(QTest::qWaitForWindowExposed(m_window, PATIENCE_MS));
     KSPushbutton* move = nullptr;
-    for (KSPushbutton* button : mWindow->findChildren<KSPushbutton*>())
+    for (KSPushbutton* button : m_window->findChildren<KSPushbutton*>())
         if (button->text() == "Move")
             move = button;
     QVERIFY(move);
     QTest::mouseClick(move, Qt::LeftButton);
-    QVERIFY(mWindow->archiveListIsMoveMode());
+    QVERIFY(m_window->archiveListIsMoveMode());
     QCOMPARE(move->text(), QString("Done"));
     QTest::mouseClick(list(), Qt::LeftButton, {}, QPoint(20, 900));
-    QVERIFY(mWindow->archiveListIsMoveMode());
-    QTest::mouseClick(mWindow, Qt::LeftButton, {}, QPoint(1000, 950));
-    QVERIFY(!mWindow->archiveListIsMoveMode());
+    QVERIFY(m_window->archiveListIsMoveMode());
+    QTest::mouseClick(m_window, Qt::LeftButton, {}, QPoint(1000, 950));
+    QVERIFY(!m_window->archiveListIsMoveMode());
     QCOMPARE(move->text(), QString("Move"));
 
     QTest::mouseClick(move, Qt::LeftButton);
     QTest::mouseClick(move, Qt::LeftButton);
-    QVERIFY(!mWindow->archiveListIsMoveMode());
+    QVERIFY(!m_window->archiveListIsMoveMode());
     QTest::mouseClick(move, Qt::LeftButton);
     Q_EMIT TitlerAPPEventFilterController::getInstance()->signalRestoreOriginal();
-    QVERIFY(!mWindow->archiveListIsMoveMode());
+    QVERIFY(!m_window->archiveListIsMoveMode());
 }
 
 void tst_titlerwindow::masksGoWithTheWindow_data()
@@ -443,8 +443,8 @@ void tst_titlerwindow::masksGoWithTheWindow()
     const QString folder = writeFolder("masked", {"t1"});
     ShowMessageController* messages = ShowMessageController::getInstance();
     const auto isDark = [this] {
-        for (const QWidget* child : mWindow->findChildren<QWidget*>(QString(), Qt::FindDirectChildrenOnly))
-            if (child->geometry() == mWindow->rect() && child->autoFillBackground() && !child->isHidden() &&
+        for (const QWidget* child : m_window->findChildren<QWidget*>(QString(), Qt::FindDirectChildrenOnly))
+            if (child->geometry() == m_window->rect() && child->autoFillBackground() && !child->isHidden() &&
                 child->palette().color(QPalette::Window).alpha() == 166)
                 return true;
         return false;
@@ -453,16 +453,16 @@ void tst_titlerwindow::masksGoWithTheWindow()
     QVERIFY(!isDark());
     isMessage ? messages->showMessageOpacityWidget() : messages->showDialogOpacityWidget();
     QVERIFY(isDark());
-    mWindow->closeTitlerWindow(); // as the answer to a message does while its box is still up
-    QVERIFY(!mWindow->isVisible());
+    m_window->closeTitlerWindow(); // as the answer to a message does while its box is still up
+    QVERIFY(!m_window->isVisible());
     if (isOffWhileHidden)
         isMessage ? messages->hideMessageOpacityWidget() : messages->hideDialogOpacityWidget();
     QVERIFY(!isDark());
     request(folder);
     QVERIFY(!isDark());
-    QVERIFY(mWindow->testAttribute(Qt::WA_AcceptTouchEvents));
-    QMetaObject::invokeMethod(mWindow->findChild<ToolsBar*>(), "closeButtonClick");
-    QVERIFY(!mWindow->isVisible());
+    QVERIFY(m_window->testAttribute(Qt::WA_AcceptTouchEvents));
+    QMetaObject::invokeMethod(m_window->findChild<ToolsBar*>(), "closeButtonClick");
+    QVERIFY(!m_window->isVisible());
 }
 
 void tst_titlerwindow::theKeyboardLearnsTheWindowAtClose()
@@ -470,10 +470,10 @@ void tst_titlerwindow::theKeyboardLearnsTheWindowAtClose()
     request(writeFolder("window id", {"t1"}));
     const QString line = QStringLiteral("200: App Name:%1***WID:%2")
                              .arg(QCoreApplication::instance()->objectName())
-                             .arg(mWindow->winId());
-    mLog.takeDebugLines();
-    mWindow->closeTitlerWindow();
-    QCOMPARE(mLog.takeDebugLines("KSInputContext").count(line), 1);
+                             .arg(m_window->winId());
+    m_log.takeDebugLines();
+    m_window->closeTitlerWindow();
+    QCOMPARE(m_log.takeDebugLines("KSInputContext").count(line), 1);
 }
 
 void tst_titlerwindow::debugLinesGoToTheDebugLog()
@@ -485,7 +485,7 @@ void tst_titlerwindow::debugLinesGoToTheDebugLog()
             if (type == QtDebugMsg)
                 printed.append(text);
         });
-    mLog.takeDebugLines();
+    m_log.takeDebugLines();
     const QString folder = writeFolder("debug lines", {"t1"});
     Archive archive;
     archive.setPath((folder + "/saved.xml").toStdString());
@@ -497,7 +497,7 @@ void tst_titlerwindow::debugLinesGoToTheDebugLog()
     ShowTitlerController::getInstance()->changeFolderStatus(status);
     qInstallMessageHandler(before);
     QCOMPARE(printed, QStringList());
-    const QStringList lines = mLog.takeDebugLines();
+    const QStringList lines = m_log.takeDebugLines();
     for (const QString& line :
          {QStringLiteral("[ArchiveController] 200: Save new Archive Success !"),
           QStringLiteral("[CanvasController] 200: Save Archive Success !"),
@@ -517,19 +517,19 @@ void tst_titlerwindow::masksOnlyWhileVisible()
     request(writeFolder("masks", {"t1"}));
     messages->showDialogOpacityWidget();
     QCOMPARE(spy.size(), 1);
-    QVERIFY(!mWindow->testAttribute(Qt::WA_AcceptTouchEvents));
+    QVERIFY(!m_window->testAttribute(Qt::WA_AcceptTouchEvents));
     messages->showMessageOpacityWidget();
     messages->hideMessageOpacityWidget();
-    QVERIFY(!mWindow->testAttribute(Qt::WA_AcceptTouchEvents));
+    QVERIFY(!m_window->testAttribute(Qt::WA_AcceptTouchEvents));
     messages->hideDialogOpacityWidget();
-    QVERIFY(mWindow->testAttribute(Qt::WA_AcceptTouchEvents));
+    QVERIFY(m_window->testAttribute(Qt::WA_AcceptTouchEvents));
 }
 
 void tst_titlerwindow::missingFontIsReportedOnShow()
 {
     const auto messages = [this] {
         QList<int> ids;
-        for (QByteArray arguments : mSiblings.argumentsOf(MESSAGE_CENTER, POST_MESSAGE)) {
+        for (QByteArray arguments : m_siblings.argumentsOf(MESSAGE_CENTER, POST_MESSAGE)) {
             MessageDefine::_tagMessageParam message;
             MessageCenterParams::deserialize_postMessage_param(message, arguments.data(),
                                                                long(arguments.size()));
@@ -537,16 +537,16 @@ void tst_titlerwindow::missingFontIsReportedOnShow()
         }
         return ids;
     };
-    mSiblings.forget();
-    mWindow->setHasMessageToShowInformation(true, "No Such Family");
+    m_siblings.forget();
+    m_window->setHasMessageToShowInformation(true, "No Such Family");
     request(writeFolder("fonts", {"t1"}));
     QTRY_COMPARE(messages(), QList<int>{MessageDef::MESSAGE_FONT_MISSING});
     // The message left once; a second show has nothing to tell.
-    mWindow->closeTitlerWindow();
+    m_window->closeTitlerWindow();
     request(writeFolder("fonts", {"t1"}));
-    QVERIFY(mWindow->isVisible());
-    mWindow->closeTitlerWindow();
-    QTRY_COMPARE(mSiblings.countOf(MESSAGE_CENTER, SET_TOP_WINDOW), 4);
+    QVERIFY(m_window->isVisible());
+    m_window->closeTitlerWindow();
+    QTRY_COMPARE(m_siblings.countOf(MESSAGE_CENTER, SET_TOP_WINDOW), 4);
     QCOMPARE(messages(), QList<int>{MessageDef::MESSAGE_FONT_MISSING});
 }
 
@@ -554,20 +554,20 @@ void tst_titlerwindow::windowManagerCloseKeepsTheProcess()
 {
     QSignalSpy quit(qApp, &QCoreApplication::aboutToQuit);
     request(writeFolder("wm", {"t1"}));
-    mWindow->close();
-    QVERIFY(!mWindow->isVisible());
+    m_window->close();
+    QVERIFY(!m_window->isVisible());
     QCOMPARE(quit.size(), 0);
-    request(mFiles.titleRoot() + "/wm");
-    QVERIFY(mWindow->isVisible());
+    request(m_files.titleRoot() + "/wm");
+    QVERIFY(m_window->isVisible());
 }
 
 void tst_titlerwindow::languageFallsBackToEnglish()
 {
-    mWindow->slotSystemLanguageChanged(SystemSetupDef::emSystemLanguageChinese);
-    QVERIFY(mWindow->styleSheet().contains("DFHeiW5-A"));
-    mWindow->slotSystemLanguageChanged(static_cast<SystemSetupDef::emSystemLanguageType>(42));
-    QVERIFY(mWindow->styleSheet().contains("'KST'"));
-    QCOMPARE(mWindow->windowTitle(), QString("Titler"));
+    m_window->slotSystemLanguageChanged(SystemSetupDef::emSystemLanguageChinese);
+    QVERIFY(m_window->styleSheet().contains("DFHeiW5-A"));
+    m_window->slotSystemLanguageChanged(static_cast<SystemSetupDef::emSystemLanguageType>(42));
+    QVERIFY(m_window->styleSheet().contains("'KST'"));
+    QCOMPARE(m_window->windowTitle(), QString("Titler"));
 }
 
 int main(int argc, char** argv)

@@ -96,8 +96,8 @@ private:
     QAction* undoAction() const;
 
     Texts textsOnDisk(const QString& stem) const;
-    ArchiveList* list() const { return mWindow->findChild<ArchiveList*>(); }
-    CanvasScene* scene() const { return mWindow->findChild<CanvasScene*>(); }
+    ArchiveList* list() const { return m_window->findChild<ArchiveList*>(); }
+    CanvasScene* scene() const { return m_window->findChild<CanvasScene*>(); }
     QStringList stems() const
     {
         QStringList result;
@@ -106,23 +106,23 @@ private:
         return result;
     }
 
-    LibraryFixture mFixture;
-    Siblings mSiblings;
-    TouchDevice mDevice;
-    std::unique_ptr<TitlerWindow> mWindow;
-    QString mFolder;
-    Answers mAnswers;
-    QStringList mMade; // file names, in the order of making
+    LibraryFixture m_fixture;
+    Siblings m_siblings;
+    TouchDevice m_device;
+    std::unique_ptr<TitlerWindow> m_window;
+    QString m_folder;
+    Answers m_answers;
+    QStringList m_made; // file names, in the order of making
     // What must be on disk at the end.
-    QStringList mOrder;
-    QMap<QString, Texts> mTexts;
-    QStringList mChanged; // these get new pictures
-    QPointF mDraggedFrom;
+    QStringList m_order;
+    QMap<QString, Texts> m_texts;
+    QStringList m_changed; // these get new pictures
+    QPointF m_draggedFrom;
 };
 
 void tst_titlerwindow_closing::initTestCase()
 {
-    QVERIFY(mSiblings.listenOnFreePorts());
+    QVERIFY(m_siblings.listenOnFreePorts());
     Q_INIT_RESOURCE(UILibrary);
     Q_INIT_RESOURCE(TitlerToolResource);
 }
@@ -130,27 +130,27 @@ void tst_titlerwindow_closing::initTestCase()
 void tst_titlerwindow_closing::init()
 {
     APPEventFilter::instance();
-    mWindow = std::make_unique<TitlerWindow>(true, nullptr);
-    pMainWindow = mWindow.get();
-    mWindow->setRealClose(false);
-    mFolder = mFixture.makeFolder(QStringLiteral("closing"));
-    mOrder = QStringList{"a", "b", "c"};
-    LibraryFixture::fillFolder(mFolder, mOrder);
-    mTexts.clear();
-    for (const QString& stem : mOrder)
-        mTexts[stem] = {{1, stem}};
-    mMade.clear();
-    mChanged.clear();
-    mDraggedFrom = {};
-    mAnswers = {};
-    mSiblings.forget();
+    m_window = std::make_unique<TitlerWindow>(true, nullptr);
+    pMainWindow = m_window.get();
+    m_window->setRealClose(false);
+    m_folder = m_fixture.makeFolder(QStringLiteral("closing"));
+    m_order = QStringList{"a", "b", "c"};
+    LibraryFixture::fillFolder(m_folder, m_order);
+    m_texts.clear();
+    for (const QString& stem : m_order)
+        m_texts[stem] = {{1, stem}};
+    m_made.clear();
+    m_changed.clear();
+    m_draggedFrom = {};
+    m_answers = {};
+    m_siblings.forget();
 }
 
 void tst_titlerwindow_closing::cleanup()
 {
-    if (mWindow && mWindow->isVisible())
-        mWindow->endProcess();
-    mWindow.reset();
+    if (m_window && m_window->isVisible())
+        m_window->endProcess();
+    m_window.reset();
     pMainWindow = nullptr;
     APPEventFilter::release();
 }
@@ -179,14 +179,14 @@ void tst_titlerwindow_closing::everyStateByEveryEnding()
     if (QTest::currentTestFailed())
         return;
     if (state != TitleCarried)
-        mOrder = stems();
+        m_order = stems();
     else if (ending == PowerOff || ending == Signal)
-        mOrder.move(1, 0); // nobody has dropped it
+        m_order.move(1, 0); // nobody has dropped it
     end(ending);
     verifyReports();
     verifyAnswer(ending);
     if (ending == PowerOff || ending == Signal) // what was deleted goes with the next Close of the folder
-        ArchiveController().deleteUnusefulArchives(mFolder);
+        ArchiveController().deleteUnusefulArchives(m_folder);
     verifyDisk();
 }
 
@@ -210,21 +210,21 @@ void tst_titlerwindow_closing::folderGone()
     enter(state);
     if (QTest::currentTestFailed())
         return;
-    QTRY_VERIFY(scene()->isEditFinish());           // or what is being written comes in between
-    QTRY_VERIFY(QDir(mFolder).removeRecursively()); // a kept version may just be going
+    QTRY_VERIFY(scene()->isEditFinish());            // or what is being written comes in between
+    QTRY_VERIFY(QDir(m_folder).removeRecursively()); // a kept version may just be going
     end(ending);
-    QVERIFY(!mWindow->isVisible());
-    QVERIFY(!QFileInfo::exists(mFolder)); // nor does it come back half
-    QCOMPARE(mAnswers.calls, ending == AnswerOfCreation ? 1 : 0);
-    QCOMPARE(mAnswers.paths, ending == AnswerOfCreation ? mMade : QStringList()); // as they were made
+    QVERIFY(!m_window->isVisible());
+    QVERIFY(!QFileInfo::exists(m_folder)); // nor does it come back half
+    QCOMPARE(m_answers.calls, ending == AnswerOfCreation ? 1 : 0);
+    QCOMPARE(m_answers.paths, ending == AnswerOfCreation ? m_made : QStringList()); // as they were made
 }
 
 void tst_titlerwindow_closing::powerOffOverTheQuestion()
 {
     begin(CloseAfterQuestion);
     enter(TextTyped);
-    mWindow->closeTitlerWindow();
-    QVERIFY(mWindow->isVisible());
+    m_window->closeTitlerWindow();
+    QVERIFY(m_window->isVisible());
     end(PowerOff);
     verifyAnswer(PowerOff);
     verifyDisk();
@@ -234,38 +234,38 @@ void tst_titlerwindow_closing::closeOverTheQuestion()
 {
     begin(CloseAfterQuestion);
     enter(TextTyped);
-    mWindow->closeTitlerWindow();
-    QVERIFY(mWindow->isVisible());
-    mWindow->closeTitlerWindow(); // the question was for once
-    QVERIFY(!mWindow->isVisible());
+    m_window->closeTitlerWindow();
+    QVERIFY(m_window->isVisible());
+    m_window->closeTitlerWindow(); // the question was for once
+    QVERIFY(!m_window->isVisible());
     verifyDisk();
     // The answer comes late and finds nothing to do.
-    mWindow->continueCloseTitler({1, MessageDefine::CLOSE_OK, MessageDef::MESSAGE_CONFIRM_CLOSE});
+    m_window->continueCloseTitler({1, MessageDefine::CLOSE_OK, MessageDef::MESSAGE_CONFIRM_CLOSE});
     verifyAnswer(CloseAfterQuestion);
-    mWindow->showTitlerWindow({_titler_paramter::CREATE_OR_EDIT, mFolder.toStdWString()});
-    QCOMPARE(stems(), mOrder);
+    m_window->showTitlerWindow({_titler_paramter::CREATE_OR_EDIT, m_folder.toStdWString()});
+    QCOMPARE(stems(), m_order);
 }
 
 // Opens the folder, and makes two titles in it, the second above the first.
 void tst_titlerwindow_closing::begin(Ending ending)
 {
-    mWindow->showTitlerWindow({_titler_paramter::CREATE_OR_EDIT, mFolder.toStdWString()});
-    QVERIFY(QTest::qWaitForWindowActive(mWindow.get(), PATIENCE_MS));
+    m_window->showTitlerWindow({_titler_paramter::CREATE_OR_EDIT, m_folder.toStdWString()});
+    QVERIFY(QTest::qWaitForWindowActive(m_window.get(), PATIENCE_MS));
     QTRY_VERIFY(list()->archiveItem(2) && list()->archiveItem(2)->hasChildWidgets());
-    QCOMPARE(stems(), mOrder);
+    QCOMPARE(stems(), m_order);
     EditContextController* context = EditContextController::getInstance();
-    context->resultCallBack(new FakeTitlerCallBack(mAnswers));
+    context->resultCallBack(new FakeTitlerCallBack(m_answers));
     if (ending == AnswerOfCreation)
         context->showTitlerCreate(3); // the window is open: only the context takes note
     choose(ArchiveAction::ACTION_COPY, 0);
     for (int i = 0; i < 2; ++i) {
         choose(ArchiveAction::ACTION_PASTE, 0);
         const QString stem = stems().at(1);
-        mMade.append(stem + ".xml");
-        mTexts[stem] = {{1, "a"}};
+        m_made.append(stem + ".xml");
+        m_texts[stem] = {{1, "a"}};
     }
-    mOrder = stems();
-    QCOMPARE(mOrder.size(), 5);
+    m_order = stems();
+    QCOMPARE(m_order.size(), 5);
     list()->selectArchive(0);
 }
 
@@ -274,14 +274,14 @@ void tst_titlerwindow_closing::verifyReports()
 {
     const auto reported = [this] {
         QSet<QString> stems;
-        for (QByteArray arguments : mSiblings.argumentsOf(FILE_MANAGER, UPDATE_TITLER_STATUS)) {
+        for (QByteArray arguments : m_siblings.argumentsOf(FILE_MANAGER, UPDATE_TITLER_STATUS)) {
             FileManagerDefine::tagTitleChangeStatusParam notice;
             FileManagerControllerParams::deserialize_updateTitlerStatus_param(notice, arguments.data(),
                                                                               long(arguments.size()));
             if (notice.changeType == FileManagerDefine::TITLE_PICTURES_CHANGED)
                 stems.insert(QFileInfo(QString::fromStdWString(notice.path)).completeBaseName());
         }
-        return stems.contains(QSet<QString>(mChanged.cbegin(), mChanged.cend()));
+        return stems.contains(QSet<QString>(m_changed.cbegin(), m_changed.cend()));
     };
     const QDeadlineTimer limit(PATIENCE_MS);
     while (!reported() && !limit.hasExpired())
@@ -291,39 +291,39 @@ void tst_titlerwindow_closing::verifyReports()
 
 void tst_titlerwindow_closing::verifyAnswer(Ending ending)
 {
-    QVERIFY(!mWindow->isVisible());
+    QVERIFY(!m_window->isVisible());
     if (ending != AnswerOfCreation) {
-        QCOMPARE(mAnswers.calls, 0);
+        QCOMPARE(m_answers.calls, 0);
         return;
     }
-    QCOMPARE(mAnswers.calls, 1);
-    QCOMPARE(mAnswers.paths, (QStringList{mMade.at(1), mMade.at(0)})); // the order of the folder
+    QCOMPARE(m_answers.calls, 1);
+    QCOMPARE(m_answers.paths, (QStringList{m_made.at(1), m_made.at(0)})); // the order of the folder
 }
 
 void tst_titlerwindow_closing::verifyDisk()
 {
     QVERIFY(FileSyncQueue::flush(std::chrono::seconds(30))); // the versions before are kept until then
-    QCOMPARE(LibraryFixture::order(mFolder), mOrder);
+    QCOMPARE(LibraryFixture::order(m_folder), m_order);
     QSet<QString> known{".order.xml"};
-    for (const QString& stem : std::as_const(mOrder)) {
-        QCOMPARE(textsOnDisk(stem), mTexts.value(stem));
+    for (const QString& stem : std::as_const(m_order)) {
+        QCOMPARE(textsOnDisk(stem), m_texts.value(stem));
         known.insert(stem + ".xml");
         for (const char* picture : PICTURES) {
             known.insert(stem + picture);
-            if (mChanged.contains(stem))
-                QVERIFY2(!QImage(mFolder + '/' + stem + picture).isNull(), picture);
+            if (m_changed.contains(stem))
+                QVERIFY2(!QImage(m_folder + '/' + stem + picture).isNull(), picture);
         }
     }
-    const QStringList files = QDir(mFolder).entryList(QDir::Files | QDir::Hidden);
+    const QStringList files = QDir(m_folder).entryList(QDir::Files | QDir::Hidden);
     for (const QString& file : files)
         QVERIFY2(known.contains(file), qPrintable(file));
-    if (mDraggedFrom.isNull())
+    if (m_draggedFrom.isNull())
         return;
     Archive archive;
-    QVERIFY(ArchiveController().getOneArchive(mFolder + "/a.xml", &archive));
+    QVERIFY(ArchiveController().getOneArchive(m_folder + "/a.xml", &archive));
     const TText* text = archive.text().front();
     const QPointF saved(text->getXValue(), text->getYValue());
-    QVERIFY((saved - mDraggedFrom).manhattanLength() < 0.1);
+    QVERIFY((saved - m_draggedFrom).manhattanLength() < 0.1);
 }
 
 void tst_titlerwindow_closing::enter(State state)
@@ -333,21 +333,21 @@ void tst_titlerwindow_closing::enter(State state)
         break;
     case TextTyped:
         typeText(1, QStringLiteral(" 快讯"));
-        mTexts["a"][1] += QStringLiteral(" 快讯");
-        mChanged = QStringList{"a"};
+        m_texts["a"][1] += QStringLiteral(" 快讯");
+        m_changed = QStringList{"a"};
         break;
     case TextSelected:
         typeText(1, QStringLiteral("!"));
-        mWindow->hideSoftWareWithDeleteEmptyItems();
+        m_window->hideSoftWareWithDeleteEmptyItems();
         scene()->findTextItem(1)->setSelected(true);
-        mTexts["a"][1] += QStringLiteral("!");
-        mChanged = QStringList{"a"};
+        m_texts["a"][1] += QStringLiteral("!");
+        m_changed = QStringList{"a"};
         break;
     case NewTextTyped:
-        mWindow->slotNewTextButtonClicked();
+        m_window->slotNewTextButtonClicked();
         typeText(2, QStringLiteral("second"));
-        mTexts["a"][2] = scene()->findTextItem(2)->toPlainText();
-        mChanged = QStringList{"a"};
+        m_texts["a"][2] = scene()->findTextItem(2)->toPlainText();
+        m_changed = QStringList{"a"};
         break;
     case ObjectDragged:
         dragObject();
@@ -363,23 +363,23 @@ void tst_titlerwindow_closing::enter(State state)
         for (int row = 0; row < list()->count(); ++row) {
             tapTitle(row);
             QCOMPARE(list()->getItemIndex(list()->getSelectedArchive()), row);
-            const QString stem = mOrder.at(row);
+            const QString stem = m_order.at(row);
             typeText(1, QStringLiteral("+"));
-            mTexts[stem][1] += QStringLiteral("+");
-            mChanged.append(stem);
+            m_texts[stem][1] += QStringLiteral("+");
+            m_changed.append(stem);
         }
         break;
     case PasteDeletedAtOnce:
         choose(ArchiveAction::ACTION_PASTE, 0);
         QCOMPARE(list()->count(), 6);
         choose(ArchiveAction::ACTION_DELETE, 1);
-        QCOMPARE(stems(), mOrder);
+        QCOMPARE(stems(), m_order);
         break;
     case DeletedAndUndone:
         choose(ArchiveAction::ACTION_DELETE, 2);
         QCOMPARE(list()->count(), 4);
         undoAction()->trigger();
-        QCOMPARE(stems(), mOrder);
+        QCOMPARE(stems(), m_order);
         break;
     }
 }
@@ -389,21 +389,21 @@ void tst_titlerwindow_closing::end(Ending ending)
     switch (ending) {
     case Close:
         EditContextController::getInstance()->resultCallBack(nullptr);
-        mWindow->closeTitlerWindow();
+        m_window->closeTitlerWindow();
         break;
     case CloseAfterQuestion:
-        mWindow->closeTitlerWindow();
-        QVERIFY(mWindow->isVisible());
-        mWindow->continueCloseTitler({1, MessageDefine::CLOSE_CANCEL, MessageDef::MESSAGE_CONFIRM_CLOSE});
+        m_window->closeTitlerWindow();
+        QVERIFY(m_window->isVisible());
+        m_window->continueCloseTitler({1, MessageDefine::CLOSE_CANCEL, MessageDef::MESSAGE_CONFIRM_CLOSE});
         break;
     case AnswerOfCreation:
-        mWindow->closeTitlerWindow();
+        m_window->closeTitlerWindow();
         break;
     case PowerOff:
         TitlerPowerController::getInstance()->powerOff();
         break;
     case Signal:
-        mWindow->endProcess();
+        m_window->endProcess();
         break;
     }
 }
@@ -421,8 +421,8 @@ void tst_titlerwindow_closing::typeText(int id, const QString& text)
 
 void tst_titlerwindow_closing::finger(QEventPoint::State state, const QWidget* widget, const QPoint& place)
 {
-    const QPoint point = widget->mapTo(mWindow.get(), place);
-    auto touch = QTest::touchEvent(mWindow.get(), mDevice);
+    const QPoint point = widget->mapTo(m_window.get(), place);
+    auto touch = QTest::touchEvent(m_window.get(), m_device);
     if (state == QEventPoint::Pressed)
         touch.press(0, point);
     else if (state == QEventPoint::Released)
@@ -434,7 +434,7 @@ void tst_titlerwindow_closing::finger(QEventPoint::State state, const QWidget* w
 // The finger stays down.
 void tst_titlerwindow_closing::dragObject()
 {
-    auto* view = mWindow->findChild<GraphicsView*>();
+    auto* view = m_window->findChild<GraphicsView*>();
     const GraphicsText* item = scene()->findTextItem(1);
     const QPoint from = view->mapFromScene(item->sceneBoundingRect().center());
     finger(QEventPoint::Pressed, view, from);
@@ -446,18 +446,18 @@ void tst_titlerwindow_closing::dragObject()
     for (int step = 1; step <= 10; ++step)
         finger(QEventPoint::Updated, view, from + QPoint(12, 6) * step);
     QVERIFY(item->scenePos() != before);
-    mDraggedFrom = before; // where an object returns that nobody has let go of
+    m_draggedFrom = before; // where an object returns that nobody has let go of
 }
 
 // To below the next title; the finger stays down.
 void tst_titlerwindow_closing::carryTitle()
 {
-    mWindow->editAndDoneButtonClicked();
+    m_window->editAndDoneButtonClicked();
     finger(QEventPoint::Pressed, list(), QPoint(HANDLE_X, 65));
     QTRY_VERIFY(list()->getMoveState());
     for (int step = 1; step <= 8; ++step)
         finger(QEventPoint::Updated, list(), QPoint(HANDLE_X, 65 + ROW * step / 8));
-    mOrder.move(0, 1);
+    m_order.move(0, 1);
 }
 
 void tst_titlerwindow_closing::tapTitle(int row)
@@ -477,7 +477,7 @@ void tst_titlerwindow_closing::choose(ArchiveAction::ARCHIVE_ACTION_TYPE type, i
 
 QAction* tst_titlerwindow_closing::undoAction() const
 {
-    for (QAction* action : mWindow->findChildren<QAction*>(QString(), Qt::FindDirectChildrenOnly))
+    for (QAction* action : m_window->findChildren<QAction*>(QString(), Qt::FindDirectChildrenOnly))
         if (action->text().startsWith("Undo"))
             return action;
     return nullptr;
@@ -486,7 +486,7 @@ QAction* tst_titlerwindow_closing::undoAction() const
 Texts tst_titlerwindow_closing::textsOnDisk(const QString& stem) const
 {
     Archive archive;
-    if (!ArchiveController().getOneArchive(mFolder + '/' + stem + ".xml", &archive))
+    if (!ArchiveController().getOneArchive(m_folder + '/' + stem + ".xml", &archive))
         return {{0, QStringLiteral("unreadable")}};
     Texts texts;
     for (const TText* text : archive.text())

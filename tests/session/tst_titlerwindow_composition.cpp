@@ -39,21 +39,21 @@ private Q_SLOTS:
 
 private:
     void take(Road road);
-    ArchiveList* list() const { return mWindow->findChild<ArchiveList*>(); }
-    CanvasScene* scene() const { return mWindow->findChild<CanvasScene*>(); }
+    ArchiveList* list() const { return m_window->findChild<ArchiveList*>(); }
+    CanvasScene* scene() const { return m_window->findChild<CanvasScene*>(); }
 
-    LibraryFixture mFixture;
-    Siblings mSiblings;
+    LibraryFixture m_fixture;
+    Siblings m_siblings;
     // The first context of a program is the one that the window works with.
-    FakeInputMethod* mMethod = nullptr;
-    std::unique_ptr<KSInputContext> mContext;
-    std::unique_ptr<TitlerWindow> mWindow;
-    QString mFolder;
+    FakeInputMethod* m_method = nullptr;
+    std::unique_ptr<KSInputContext> m_context;
+    std::unique_ptr<TitlerWindow> m_window;
+    QString m_folder;
 };
 
 void tst_titlerwindow_composition::initTestCase()
 {
-    QVERIFY(mSiblings.listenOnFreePorts());
+    QVERIFY(m_siblings.listenOnFreePorts());
     Q_INIT_RESOURCE(UILibrary);
     Q_INIT_RESOURCE(TitlerToolResource);
     QCOMPARE(KSInputContext::instance(), nullptr);
@@ -62,27 +62,27 @@ void tst_titlerwindow_composition::initTestCase()
 void tst_titlerwindow_composition::init()
 {
     auto method = std::make_unique<FakeInputMethod>();
-    mMethod = method.get();
-    mContext = std::make_unique<KSInputContext>(std::move(method));
+    m_method = method.get();
+    m_context = std::make_unique<KSInputContext>(std::move(method));
     APPEventFilter::instance();
-    mWindow = std::make_unique<TitlerWindow>(true, nullptr);
-    pMainWindow = mWindow.get();
-    mWindow->setRealClose(false);
-    mContext->setKeyBoardController(nullptr); // a keyboard with keys
-    mFolder = mFixture.makeFolder(QStringLiteral("composition"));
-    LibraryFixture::fillFolder(mFolder, {"a", "b"});
-    mWindow->showTitlerWindow({_titler_paramter::CREATE_OR_EDIT, mFolder.toStdWString()});
-    QVERIFY(QTest::qWaitForWindowActive(mWindow.get(), PATIENCE_MS));
+    m_window = std::make_unique<TitlerWindow>(true, nullptr);
+    pMainWindow = m_window.get();
+    m_window->setRealClose(false);
+    m_context->setKeyBoardController(nullptr); // a keyboard with keys
+    m_folder = m_fixture.makeFolder(QStringLiteral("composition"));
+    LibraryFixture::fillFolder(m_folder, {"a", "b"});
+    m_window->showTitlerWindow({_titler_paramter::CREATE_OR_EDIT, m_folder.toStdWString()});
+    QVERIFY(QTest::qWaitForWindowActive(m_window.get(), PATIENCE_MS));
     QTRY_VERIFY(list()->archiveItem(1) && list()->archiveItem(1)->hasChildWidgets());
 }
 
 void tst_titlerwindow_composition::cleanup()
 {
-    if (mWindow->isVisible())
-        mWindow->closeTitlerMainWindow();
-    mWindow.reset();
+    if (m_window->isVisible())
+        m_window->closeTitlerMainWindow();
+    m_window.reset();
     pMainWindow = nullptr;
-    mContext.reset();
+    m_context.reset();
     APPEventFilter::release();
 }
 
@@ -98,23 +98,23 @@ void tst_titlerwindow_composition::take(Road road)
 {
     switch (road) {
     case MoveMode:
-        for (KSPushbutton* button : mWindow->findChildren<KSPushbutton*>())
+        for (KSPushbutton* button : m_window->findChildren<KSPushbutton*>())
             if (button->text() == TitlerWindow::tr("Move"))
                 button->click();
-        QVERIFY(mWindow->archiveListIsMoveMode());
+        QVERIFY(m_window->archiveListIsMoveMode());
         break;
     case OtherTitle:
         Q_EMIT list()->widgetItemReleased(list()->archiveItem(1), QPoint(), list());
         QCOMPARE(list()->getItemIndex(list()->getSelectedArchive()), 1);
         break;
     case NewText:
-        mWindow->slotNewTextButtonClicked();
+        m_window->slotNewTextButtonClicked();
         break;
     case Close:
-        mWindow->closeTitlerWindow();
+        m_window->closeTitlerWindow();
         break;
     case Ending:
-        mWindow->endProcess();
+        m_window->endProcess();
         break;
     }
 }
@@ -122,9 +122,9 @@ void tst_titlerwindow_composition::take(Road road)
 void tst_titlerwindow_composition::isCommitted()
 {
     QFETCH(Road, road);
-    auto* view = mWindow->findChild<GraphicsView*>();
+    auto* view = m_window->findChild<GraphicsView*>();
     view->setFocus();
-    mContext->setFocusObject(view);
+    m_context->setFocusObject(view);
     GraphicsText* item = scene()->findTextItem(1);
     item->initNewTextSelectAll();
     QTextCursor cursor = item->textCursor();
@@ -134,21 +134,21 @@ void tst_titlerwindow_composition::isCommitted()
     QCoreApplication::sendEvent(view, &composing);
     QCOMPARE(cursor.block().layout()->preeditAreaText(), QStringLiteral("kuai"));
     QCOMPARE(item->toPlainText(), QStringLiteral("a"));
-    mMethod->composed = QString::fromUtf8("快");
-    mMethod->commits = 0;
+    m_method->composed = QString::fromUtf8("快");
+    m_method->commits = 0;
 
     const QPointer<GraphicsText> alive = item;
     take(road);
-    QVERIFY(mMethod->commits > 0);
-    QVERIFY(mMethod->composed.isEmpty());
+    QVERIFY(m_method->commits > 0);
+    QVERIFY(m_method->composed.isEmpty());
     if (alive && scene()->findTextItem(1) == item) {
         QCOMPARE(item->toPlainText(), QString::fromUtf8("a快"));
         QVERIFY(item->document()->firstBlock().layout()->preeditAreaText().isEmpty());
     }
-    if (mWindow->isVisible())
-        mWindow->closeTitlerWindow();
+    if (m_window->isVisible())
+        m_window->closeTitlerWindow();
     Archive archive;
-    QVERIFY(ArchiveController().getOneArchive(mFolder + "/a.xml", &archive));
+    QVERIFY(ArchiveController().getOneArchive(m_folder + "/a.xml", &archive));
     QCOMPARE(QString::fromStdString(archive.text().front()->getText()), QString::fromUtf8("a快"));
 }
 

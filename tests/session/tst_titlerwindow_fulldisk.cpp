@@ -109,8 +109,8 @@ private Q_SLOTS:
     void savingIsShown();
 
 private:
-    ArchiveList* list() const { return mWindow->findChild<ArchiveList*>(); }
-    CanvasScene* scene() const { return mWindow->findChild<CanvasScene*>(); }
+    ArchiveList* list() const { return m_window->findChild<ArchiveList*>(); }
+    CanvasScene* scene() const { return m_window->findChild<CanvasScene*>(); }
     void type(const QString& text)
     {
         GraphicsText* item = scene()->findTextItem(1);
@@ -128,14 +128,14 @@ private:
     }
     void answer(MessageDefine::_emCloseType type)
     {
-        mWindow->continueCloseTitler({1, type, MessageDef::MESSAGE_CONFIRM_CLOSE});
+        m_window->continueCloseTitler({1, type, MessageDef::MESSAGE_CONFIRM_CLOSE});
     }
     // Texts of the boxes with this number that were asked for.
     QStringList boxes(int number) const
     {
         QStringList texts;
-        for (QByteArray call : mSiblings.argumentsOf(MessageCenterRemoteProxy::INTERFACE_ID,
-                                                     MessageCenterRemoteProxy::METHOD_postMessage)) {
+        for (QByteArray call : m_siblings.argumentsOf(MessageCenterRemoteProxy::INTERFACE_ID,
+                                                      MessageCenterRemoteProxy::METHOD_postMessage)) {
             MessageDefine::_tagMessageParam message;
             MessageCenterParams::deserialize_postMessage_param(message, call.data(), long(call.size()));
             if (message.messageId == number)
@@ -145,31 +145,31 @@ private:
     }
     QString onDisk(const QString& name) const
     {
-        QFile file(mFolder + '/' + name);
+        QFile file(m_folder + '/' + name);
         return file.open(QIODevice::ReadOnly) ? QString::fromUtf8(file.readAll()) : QString();
     }
     // What a process sees that has nothing in memory.
     QString textOnDisk(const QString& stem) const
     {
-        const QString link = mFixture.titleRoot() + "/link.xml"; // nothing is kept for this name
+        const QString link = m_fixture.titleRoot() + "/link.xml"; // nothing is kept for this name
         QFile::remove(link);
         Archive title;
-        if (!QFile::link(mFolder + '/' + stem + ".xml", link) ||
+        if (!QFile::link(m_folder + '/' + stem + ".xml", link) ||
             !ArchiveController().getOneArchive(link, &title) || title.text().empty())
             return {};
         return QString::fromStdString(title.text().front()->getText());
     }
 
-    LibraryFixture mFixture;
-    LogFixture mLog;
-    Siblings mSiblings;
-    std::unique_ptr<TitlerWindow> mWindow;
-    QString mFolder;
+    LibraryFixture m_fixture;
+    LogFixture m_log;
+    Siblings m_siblings;
+    std::unique_ptr<TitlerWindow> m_window;
+    QString m_folder;
 };
 
 void tst_titlerwindow_fulldisk::initTestCase()
 {
-    QVERIFY(mSiblings.listenOnFreePorts());
+    QVERIFY(m_siblings.listenOnFreePorts());
     Q_INIT_RESOURCE(UILibrary);
     Q_INIT_RESOURCE(TitlerToolResource);
 }
@@ -177,24 +177,24 @@ void tst_titlerwindow_fulldisk::initTestCase()
 void tst_titlerwindow_fulldisk::init()
 {
     APPEventFilter::instance();
-    mWindow = std::make_unique<TitlerWindow>(true, nullptr);
-    pMainWindow = mWindow.get();
-    mWindow->setRealClose(false);
-    mFolder = mFixture.makeFolder(QStringLiteral("News"));
-    LibraryFixture::fillFolder(mFolder, {"a", "b", "c"});
-    mSiblings.forget();
-    mWindow->showTitlerWindow({_titler_paramter::CREATE_OR_EDIT, mFolder.toStdWString()});
-    QVERIFY(QTest::qWaitForWindowActive(mWindow.get(), PATIENCE_MS));
+    m_window = std::make_unique<TitlerWindow>(true, nullptr);
+    pMainWindow = m_window.get();
+    m_window->setRealClose(false);
+    m_folder = m_fixture.makeFolder(QStringLiteral("News"));
+    LibraryFixture::fillFolder(m_folder, {"a", "b", "c"});
+    m_siblings.forget();
+    m_window->showTitlerWindow({_titler_paramter::CREATE_OR_EDIT, m_folder.toStdWString()});
+    QVERIFY(QTest::qWaitForWindowActive(m_window.get(), PATIENCE_MS));
     QTRY_VERIFY(list()->archiveItem(2) && list()->archiveItem(2)->hasChildWidgets());
     QTRY_VERIFY(scene()->isEditFinish());
 }
 
 void tst_titlerwindow_fulldisk::cleanup()
 {
-    RefusedWrites::forgetFolder(mFixture.titleRoot().toStdString());
-    if (mWindow && mWindow->isVisible())
-        mWindow->endProcess();
-    mWindow.reset();
+    RefusedWrites::forgetFolder(m_fixture.titleRoot().toStdString());
+    if (m_window && m_window->isVisible())
+        m_window->endProcess();
+    m_window.reset();
     pMainWindow = nullptr;
     APPEventFilter::release();
 }
@@ -204,17 +204,17 @@ void tst_titlerwindow_fulldisk::closeAsksBeforeWorkIsLost()
     {
         const FullDisk disk;
         type(QStringLiteral(" 快讯"));
-        mWindow->closeTitlerWindow();
-        QVERIFY(mWindow->isVisible());
+        m_window->closeTitlerWindow();
+        QVERIFY(m_window->isVisible());
         QTRY_COMPARE(boxes(117).size(), 1);
         QVERIFY2(boxes(117).front().contains(QString::fromUtf8("\"a 快讯\"")),
                  qPrintable(boxes(117).front()));
-        QTRY_COMPARE(boxes(114), QStringList{"File"});                   // once, however much was refused
-        mWindow->continueCloseTitler({1, MessageDefine::CLOSE_OK, 114}); // another box
-        QVERIFY(mWindow->isVisible());
+        QTRY_COMPARE(boxes(114), QStringList{"File"});                    // once, however much was refused
+        m_window->continueCloseTitler({1, MessageDefine::CLOSE_OK, 114}); // another box
+        QVERIFY(m_window->isVisible());
         answer(MessageDefine::CLOSE_OK);
     }
-    QVERIFY(!mWindow->isVisible());
+    QVERIFY(!m_window->isVisible());
     QVERIFY(RefusedWrites::isEmpty());
     QCOMPARE(textOnDisk("a"), QStringLiteral("a"));
 }
@@ -224,23 +224,23 @@ void tst_titlerwindow_fulldisk::cancelKeepsTheSession()
     {
         const FullDisk disk;
         type(QStringLiteral("!"));
-        mWindow->closeTitlerWindow();
+        m_window->closeTitlerWindow();
         QTRY_COMPARE(boxes(117).size(), 1);
         answer(MessageDefine::CLOSE_CANCEL);
-        QVERIFY(mWindow->isVisible());
+        QVERIFY(m_window->isVisible());
         type(QStringLiteral("?"));
-        mWindow->closeTitlerWindow();
+        m_window->closeTitlerWindow();
         QTRY_COMPARE(boxes(117).size(), 2);
         answer(MessageDefine::CLOSE_CANCEL);
-        QVERIFY(mWindow->isVisible());
+        QVERIFY(m_window->isVisible());
         QCOMPARE(textOnDisk("a"), QStringLiteral("a"));
     }
     // Nobody does anything.
     QTRY_COMPARE(textOnDisk("a"), QStringLiteral("a!?"));
     QTRY_VERIFY(RefusedWrites::isEmpty());
     QCOMPARE(boxes(114).size(), 1);
-    mWindow->closeTitlerWindow();
-    QVERIFY(!mWindow->isVisible());
+    m_window->closeTitlerWindow();
+    QVERIFY(!m_window->isVisible());
     QCOMPARE(boxes(117).size(), 2);
 }
 
@@ -249,44 +249,44 @@ void tst_titlerwindow_fulldisk::workThatFitsByNowIsNotAskedAbout()
     {
         const FullDisk disk;
         type(QStringLiteral("!"));
-        mWindow->hideSoftWareWithDeleteEmptyItems();
+        m_window->hideSoftWareWithDeleteEmptyItems();
         choose(ArchiveAction::ACTION_DELETE, 2);
         QVERIFY(!RefusedWrites::isEmpty());
     }
-    mWindow->closeTitlerWindow();
-    QVERIFY(!mWindow->isVisible());
+    m_window->closeTitlerWindow();
+    QVERIFY(!m_window->isVisible());
     QCOMPARE(textOnDisk("a"), QStringLiteral("a!"));
     QVERIFY(!onDisk(".order.xml").contains("c.xml"));
     for (const char* picture : {"/a_1920.png", "/a_960.png", "/a_240.png", "/a_240S.png"})
-        QVERIFY2(!QImage(mFolder + picture).isNull(), picture);
-    QCOMPARE(QImage(mFolder + "/a_1920.png").size(), QSize(1920, 1080));
+        QVERIFY2(!QImage(m_folder + picture).isNull(), picture);
+    QCOMPARE(QImage(m_folder + "/a_1920.png").size(), QSize(1920, 1080));
     QVERIFY(RefusedWrites::isEmpty());
 }
 
 void tst_titlerwindow_fulldisk::orderAndPicturesAreNamed()
 {
     type(QStringLiteral("!"));
-    mWindow->hideSoftWareWithDeleteEmptyItems();
+    m_window->hideSoftWareWithDeleteEmptyItems();
     const FullDisk disk;
     choose(ArchiveAction::ACTION_DELETE, 2);
-    mWindow->closeTitlerWindow();
-    QVERIFY(mWindow->isVisible());
+    m_window->closeTitlerWindow();
+    QVERIFY(m_window->isVisible());
     QTRY_COMPARE(boxes(117).size(), 1);
     const QString text = boxes(117).front();
     QVERIFY2(text.contains("the order of the titles in \"News\""), qPrintable(text));
     QVERIFY2(text.contains("the pictures of \"a!\""), qPrintable(text));
     QVERIFY2(!text.contains("the title \""), qPrintable(text));
     answer(MessageDefine::CLOSE_OK);
-    QVERIFY(!mWindow->isVisible());
-    QCOMPARE(QImage(mFolder + "/a_1920.png").size(), QSize(240, 135)); // the one before is still on air
+    QVERIFY(!m_window->isVisible());
+    QCOMPARE(QImage(m_folder + "/a_1920.png").size(), QSize(240, 135)); // the one before is still on air
 }
 
 void tst_titlerwindow_fulldisk::endOfTheProcessAsksNobody()
 {
     const FullDisk disk;
     type(QStringLiteral("!"));
-    mWindow->endProcess();
-    QVERIFY(!mWindow->isVisible());
+    m_window->endProcess();
+    QVERIFY(!m_window->isVisible());
     QVERIFY(RefusedWrites::isEmpty());
     QCOMPARE(textOnDisk("a"), QStringLiteral("a"));
 }
@@ -300,24 +300,24 @@ void tst_titlerwindow_fulldisk::slowDiskKeepsNobodyWaiting()
     context->showTitlerCreate(3);
     choose(ArchiveAction::ACTION_COPY, 0);
     choose(ArchiveAction::ACTION_PASTE, 0);
-    mLog.takeDebugLines();
+    m_log.takeDebugLines();
     gSyncsOfTheWindow = 0;
     {
         const HangingDisk disk;
         type(QStringLiteral("!"));
-        mWindow->closeTitlerWindow(); // comes back although the disk does not
-        QVERIFY(!mWindow->isVisible());
+        m_window->closeTitlerWindow(); // comes back although the disk does not
+        QVERIFY(!m_window->isVisible());
         QCOMPARE(gSyncsOfTheWindow.load(), 0);
         QCOMPARE(answers.calls, 1);
         QCOMPARE(answers.paths.size(), 1);
         const QString stem = answers.paths.front().chopped(4);
         QCOMPARE(textOnDisk(stem), QStringLiteral("a!"));
-        QCOMPARE(QImage(mFolder + '/' + stem + "_1920.png").size(), QSize(1920, 1080));
+        QCOMPARE(QImage(m_folder + '/' + stem + "_1920.png").size(), QSize(1920, 1080));
         // The log says what the disk owes.
         QString lines;
         const auto isLogged = [&] {
-            lines += mLog.takeDebugLines("TitlerWindow").join('\n');
-            return lines.contains("not yet on the disk: " + mFolder);
+            lines += m_log.takeDebugLines("TitlerWindow").join('\n');
+            return lines.contains("not yet on the disk: " + m_folder);
         };
         QTRY_VERIFY2(isLogged(), qPrintable(lines));
     }
@@ -326,15 +326,15 @@ void tst_titlerwindow_fulldisk::slowDiskKeepsNobodyWaiting()
 
 void tst_titlerwindow_fulldisk::savingIsShown()
 {
-    auto* notice = mWindow->findChild<SavingNotice*>();
+    auto* notice = m_window->findChild<SavingNotice*>();
     QVERIFY(notice);
     PaintCounter counter(notice);
     type(QStringLiteral("!"));
-    mWindow->closeTitlerWindow();
+    m_window->closeTitlerWindow();
     QVERIFY(counter.paints > 0);
-    QCOMPARE(notice->geometry(), mWindow->rect());
+    QCOMPARE(notice->geometry(), m_window->rect());
     QVERIFY(!notice->isVisible());
-    QVERIFY(!mWindow->isVisible());
+    QVERIFY(!m_window->isVisible());
 }
 
 int main(int argc, char** argv)

@@ -43,22 +43,22 @@ private:
     void closeDialogs();
     void selectText();
 
-    ManualClock mClock; // before all widgets
-    TemplateFixture mFixture;
-    Siblings mSiblings;
-    TitlerWindow* mWindow = nullptr;
-    QStringList mNames;
+    ManualClock m_clock; // before all widgets
+    TemplateFixture m_fixture;
+    Siblings m_siblings;
+    TitlerWindow* m_window = nullptr;
+    QStringList m_names;
 };
 
 void tst_titlerwindow_interruptions::initTestCase()
 {
-    QVERIFY(mSiblings.listenOnFreePorts());
-    mFixture.resetTemplates();
-    mFixture.makePresets("templates_en", {"lower", "strap", "corner", "full", "news"});
-    mFixture.makeUserTemplates(2);
+    QVERIFY(m_siblings.listenOnFreePorts());
+    m_fixture.resetTemplates();
+    m_fixture.makePresets("templates_en", {"lower", "strap", "corner", "full", "news"});
+    m_fixture.makeUserTemplates(2);
     for (const char* name : {"news", "sports", "weather"})
-        LibraryFixture::fillFolder(mFixture.makeFolder(QLatin1String(name)), {"t1", "t2", "t3"});
-    const QString folder = mFixture.makeFolder(QStringLiteral("open"));
+        LibraryFixture::fillFolder(m_fixture.makeFolder(QLatin1String(name)), {"t1", "t2", "t3"});
+    const QString folder = m_fixture.makeFolder(QStringLiteral("open"));
     QStringList stems;
     for (int i = 10; i < 22; ++i)
         stems.append(QStringLiteral("t%1").arg(i));
@@ -66,16 +66,16 @@ void tst_titlerwindow_interruptions::initTestCase()
     APPEventFilter::instance();
     Q_INIT_RESOURCE(UILibrary);
     Q_INIT_RESOURCE(TitlerToolResource);
-    mWindow = new TitlerWindow(true, nullptr);
-    pMainWindow = mWindow;
-    mWindow->setRealClose(false);
-    mWindow->showTitlerWindow({_titler_paramter::CREATE_OR_EDIT, folder.toStdWString()});
-    QVERIFY(QTest::qWaitForWindowExposed(mWindow, PATIENCE_MS));
-    const auto* list = mWindow->findChild<ArchiveList*>();
+    m_window = new TitlerWindow(true, nullptr);
+    pMainWindow = m_window;
+    m_window->setRealClose(false);
+    m_window->showTitlerWindow({_titler_paramter::CREATE_OR_EDIT, folder.toStdWString()});
+    QVERIFY(QTest::qWaitForWindowExposed(m_window, PATIENCE_MS));
+    const auto* list = m_window->findChild<ArchiveList*>();
     QTRY_COMPARE(list->count(), 12);
     QTRY_VERIFY(list->archiveItem(11)->hasChildWidgets());
     // A tap is seen, but opens no dialog and closes no window.
-    for (QAbstractButton* button : mWindow->findChildren<QAbstractButton*>())
+    for (QAbstractButton* button : m_window->findChildren<QAbstractButton*>())
         if (!qobject_cast<KSBaseItemWidget*>(button))
             disconnect(button, &QAbstractButton::clicked, nullptr, nullptr);
 }
@@ -83,18 +83,18 @@ void tst_titlerwindow_interruptions::initTestCase()
 void tst_titlerwindow_interruptions::cleanupTestCase()
 {
     closeDialogs();
-    mWindow->closeTitlerWindow();
-    delete mWindow;
+    m_window->closeTitlerWindow();
+    delete m_window;
     pMainWindow = nullptr;
     APPEventFilter::release();
 }
 
 void tst_titlerwindow_interruptions::closeDialogs()
 {
-    mWindow->findChild<FolderPicker*>()->hide(); // closing it would end the session
-    mWindow->findChild<TemplatePicker*>()->hide();
+    m_window->findChild<FolderPicker*>()->hide(); // closing it would end the session
+    m_window->findChild<TemplatePicker*>()->hide();
     for (QWidget* window : QApplication::topLevelWidgets())
-        if (window != mWindow && window->isVisible())
+        if (window != m_window && window->isVisible())
             window->close();
     QCoreApplication::processEvents();
 }
@@ -102,11 +102,11 @@ void tst_titlerwindow_interruptions::closeDialogs()
 // As after a tap on it: the panel works on it then.
 void tst_titlerwindow_interruptions::selectText()
 {
-    auto* scene = mWindow->findChild<CanvasScene*>();
+    auto* scene = m_window->findChild<CanvasScene*>();
     scene->clearItemsSelectionAndFocus();
     if (scene->getTextItemList().isEmpty())
-        QMetaObject::invokeMethod(mWindow->findChild<ToolsBar*>(), "newTextButtonClick");
-    auto* view = mWindow->findChild<GraphicsView*>();
+        QMetaObject::invokeMethod(m_window->findChild<ToolsBar*>(), "newTextButtonClick");
+    auto* view = m_window->findChild<GraphicsView*>();
     GraphicsText* text = nullptr;
     for (QGraphicsItem* item : scene->items()) {
         auto* candidate = qgraphicsitem_cast<GraphicsText*>(item);
@@ -124,37 +124,37 @@ void tst_titlerwindow_interruptions::everyWidget_data()
 {
     QTest::addColumn<Concerns>("concerns");
     QTest::addColumn<Prepare>("prepare");
-    const Concerns dialogs = [this](const QWidget* widget) { return widget->window() != mWindow; };
+    const Concerns dialogs = [this](const QWidget* widget) { return widget->window() != m_window; };
     QTest::newRow("the window") << Concerns([this](const QWidget* widget) {
-        return widget->window() == mWindow;
+        return widget->window() == m_window;
     }) << Prepare([this] { selectText(); });
     QTest::newRow("move mode") << Concerns([this](const QWidget* widget) {
-        return mWindow->findChild<ArchiveList*>()->isAncestorOf(widget);
+        return m_window->findChild<ArchiveList*>()->isAncestorOf(widget);
     }) << Prepare([this] {
-        if (!mWindow->archiveListIsMoveMode())
-            mWindow->editAndDoneButtonClicked();
+        if (!m_window->archiveListIsMoveMode())
+            m_window->editAndDoneButtonClicked();
     });
     QTest::newRow("the folder picker") << dialogs << Prepare([this] {
-        auto* picker = mWindow->findChild<FolderPicker*>();
+        auto* picker = m_window->findChild<FolderPicker*>();
         picker->updateTreeView();
         picker->show();
         picker->treeView()->setCurrentIndex(picker->treeModel()->index(0, 0));
     });
     QTest::newRow("the editor of a folder's name") << dialogs << Prepare([this] {
-        auto* picker = mWindow->findChild<FolderPicker*>();
+        auto* picker = m_window->findChild<FolderPicker*>();
         picker->updateTreeView();
         picker->show();
         picker->startEditing(picker->treeModel()->index(0, 0));
         QVERIFY(picker->editor());
     });
     QTest::newRow("the template picker")
-        << dialogs << Prepare([this] { mWindow->findChild<TemplatePicker*>()->show(); });
+        << dialogs << Prepare([this] { m_window->findChild<TemplatePicker*>()->show(); });
     QTest::newRow("the palette") << dialogs << Prepare([this] {
         selectText();
-        mWindow->findChild<ColorPalette*>()->show();
+        m_window->findChild<ColorPalette*>()->show();
     });
     QTest::newRow("the option menu") << dialogs << Prepare([this] {
-        auto* list = mWindow->findChild<ArchiveList*>();
+        auto* list = m_window->findChild<ArchiveList*>();
         list->itemRightPressedEvent(list->archiveItem(0), QPoint(60, 60), list);
     });
 }
@@ -163,34 +163,34 @@ void tst_titlerwindow_interruptions::everyWidget()
 {
     QFETCH(Concerns, concerns);
     QFETCH(Prepare, prepare);
-    Interruptions touches(mClock);
+    Interruptions touches(m_clock);
     touches.concerns = concerns;
     touches.restore = [this, prepare] {
         closeDialogs();
-        if (mWindow->archiveListIsMoveMode())
-            mWindow->slotCancelArchiveListMoveMode();
-        mWindow->show();
-        mWindow->findChild<ArchiveList*>()->moveToWidgetItem(0);
+        if (m_window->archiveListIsMoveMode())
+            m_window->slotCancelArchiveListMoveMode();
+        m_window->show();
+        m_window->findChild<ArchiveList*>()->moveToWidgetItem(0);
         prepare();
         QCoreApplication::processEvents();
-        mClock.advance(5000);
+        m_clock.advance(5000);
     };
     QStringList result;
     const QStringList kinds = touches.kinds();
     for (const QString& name : kinds) {
-        if (mNames.contains(name))
+        if (m_names.contains(name))
             continue;
         for (const QString& problem : touches.problems(name))
             result.append(name + QStringLiteral(" after ") + problem);
     }
-    mNames += kinds;
+    m_names += kinds;
     QVERIFY2(result.isEmpty(), qPrintable(QLatin1Char('\n') + result.join(QLatin1Char('\n'))));
 }
 
 // The walk finds what there is to be found.
 void tst_titlerwindow_interruptions::everyClassIsThere()
 {
-    const QString names = mNames.join(QLatin1Char('\n'));
+    const QString names = m_names.join(QLatin1Char('\n'));
     for (const char* part : {"ArchiveItem", "movable", "GraphicsView", "ToolsBar", "TextToolsPanel",
                              "KSTreeView", "KSTreeHeaderView", "FolderEditor", "TemplateItem", "KSTabBar",
                              "ColorPalette", "ColorButton", "ArchiveMenu", "FontCombox", "KSRadiobutton"})

@@ -93,22 +93,22 @@ private:
     template <typename Widget>
     Widget* find(const QString& name = QString()) const
     {
-        return mWindow->findChild<Widget*>(name);
+        return m_window->findChild<Widget*>(name);
     }
     CanvasScene* scene() const { return find<CanvasScene>(); }
     ColorPalette* palette() const { return find<ColorPalette>(); }
     QAction* undoAction() const;
 
-    LibraryFixture mFixture;
-    Siblings mSiblings;
-    TouchDevice mDevice;
-    std::unique_ptr<TitlerWindow> mWindow;
-    QString mFolder;
+    LibraryFixture m_fixture;
+    Siblings m_siblings;
+    TouchDevice m_device;
+    std::unique_ptr<TitlerWindow> m_window;
+    QString m_folder;
 };
 
 void tst_titlerwindow_palette::initTestCase()
 {
-    QVERIFY(mSiblings.listenOnFreePorts());
+    QVERIFY(m_siblings.listenOnFreePorts());
     Q_INIT_RESOURCE(UILibrary);
     Q_INIT_RESOURCE(TitlerToolResource);
 }
@@ -133,19 +133,19 @@ TText* tst_titlerwindow_palette::makeText(const QString& text, int id, float x, 
 void tst_titlerwindow_palette::init()
 {
     APPEventFilter::instance();
-    mWindow = std::make_unique<TitlerWindow>(true, nullptr);
-    pMainWindow = mWindow.get();
-    mWindow->setRealClose(false);
-    mFolder = mFixture.makeFolder(QStringLiteral("palette"));
-    const auto archive = LibraryFixture::makeRecord(mFolder, QStringLiteral("a"), QString());
+    m_window = std::make_unique<TitlerWindow>(true, nullptr);
+    pMainWindow = m_window.get();
+    m_window->setRealClose(false);
+    m_folder = m_fixture.makeFolder(QStringLiteral("palette"));
+    const auto archive = LibraryFixture::makeRecord(m_folder, QStringLiteral("a"), QString());
     archive->setText(
         {makeText(QStringLiteral("AAAA"), 1, 100, 100), makeText(QStringLiteral("BBBB"), 2, 600, 400)});
-    LibraryFixture::fillFolder(mFolder, {QStringLiteral("b")});
-    ArchiveController().saveNewArchive(mFolder, archive.get());
-    LibraryFixture::writeOrder(mFolder, {QStringLiteral("a"), QStringLiteral("b")});
+    LibraryFixture::fillFolder(m_folder, {QStringLiteral("b")});
+    ArchiveController().saveNewArchive(m_folder, archive.get());
+    LibraryFixture::writeOrder(m_folder, {QStringLiteral("a"), QStringLiteral("b")});
 
-    mWindow->showTitlerWindow({_titler_paramter::CREATE_OR_EDIT, mFolder.toStdWString()});
-    QVERIFY(QTest::qWaitForWindowActive(mWindow.get(), PATIENCE_MS));
+    m_window->showTitlerWindow({_titler_paramter::CREATE_OR_EDIT, m_folder.toStdWString()});
+    QVERIFY(QTest::qWaitForWindowActive(m_window.get(), PATIENCE_MS));
     QTRY_VERIFY(find<ArchiveList>()->archiveItem(1) &&
                 find<ArchiveList>()->archiveItem(1)->hasChildWidgets());
     QCOMPARE(scene()->getTextItemList().size(), 2);
@@ -153,17 +153,17 @@ void tst_titlerwindow_palette::init()
 
 void tst_titlerwindow_palette::cleanup()
 {
-    if (mWindow && mWindow->isVisible())
-        mWindow->endProcess();
-    mWindow.reset();
+    if (m_window && m_window->isVisible())
+        m_window->endProcess();
+    m_window.reset();
     pMainWindow = nullptr;
     APPEventFilter::release();
 }
 
 void tst_titlerwindow_palette::finger(QEventPoint::State state, const QWidget* widget, const QPoint& place)
 {
-    const QPoint point = widget->mapTo(mWindow.get(), place);
-    auto touch = QTest::touchEvent(mWindow.get(), mDevice);
+    const QPoint point = widget->mapTo(m_window.get(), place);
+    auto touch = QTest::touchEvent(m_window.get(), m_device);
     if (state == QEventPoint::Pressed)
         touch.press(0, point);
     else
@@ -173,14 +173,14 @@ void tst_titlerwindow_palette::finger(QEventPoint::State state, const QWidget* w
 void tst_titlerwindow_palette::doubleTap(const QPoint& scenePlace)
 {
     const auto* view = find<GraphicsView>();
-    mDevice.tap(mWindow.get(), view->mapTo(mWindow.get(), view->mapFromScene(scenePlace)), 2);
+    m_device.tap(m_window.get(), view->mapTo(m_window.get(), view->mapFromScene(scenePlace)), 2);
 }
 
 void tst_titlerwindow_palette::tap(const QPoint& scenePlace)
 {
     auto* view = find<GraphicsView>();
     view->mouseClick(); // no double tap
-    mDevice.tap(mWindow.get(), view->mapTo(mWindow.get(), view->mapFromScene(scenePlace)));
+    m_device.tap(m_window.get(), view->mapTo(m_window.get(), view->mapFromScene(scenePlace)));
     view->mouseClick();
 }
 
@@ -191,7 +191,7 @@ QPoint tst_titlerwindow_palette::centerOf(int id) const
 
 QAction* tst_titlerwindow_palette::undoAction() const
 {
-    for (QAction* action : mWindow->findChildren<QAction*>(QString(), Qt::FindDirectChildrenOnly))
+    for (QAction* action : m_window->findChildren<QAction*>(QString(), Qt::FindDirectChildrenOnly))
         if (action->text().startsWith(QLatin1String("Undo")))
             return action;
     return nullptr;
@@ -222,7 +222,7 @@ QStringList tst_titlerwindow_palette::colorsOnDisk() const
 {
     Archive archive;
     QStringList colors;
-    if (!ArchiveController().getOneArchive(mFolder + "/a.xml", &archive))
+    if (!ArchiveController().getOneArchive(m_folder + "/a.xml", &archive))
         return {QStringLiteral("unreadable")};
     for (const int id : {1, 2}) {
         for (const TText* text : archive.text())
@@ -274,7 +274,7 @@ void tst_titlerwindow_palette::happen(Event event, const QString& button)
         QCOMPARE(find<ArchiveList>()->getItemIndex(find<ArchiveList>()->getSelectedArchive()), 1);
         break;
     case NewText: {
-        mWindow->slotNewTextButtonClicked();
+        m_window->slotNewTextButtonClicked();
         const GraphicsText* text = scene()->findTextItem(3);
         QVERIFY(text);
         const TextStyle& style = *text->getLastAlpaTextStyleValue()->textItems().front();
@@ -283,13 +283,13 @@ void tst_titlerwindow_palette::happen(Event event, const QString& button)
         break;
     }
     case DeletedAndBack:
-        mWindow->pressDelectButton();
+        m_window->pressDelectButton();
         QVERIFY(!scene()->findTextItem(1));
         undoAction()->trigger();
         QVERIFY(scene()->findTextItem(1));
         break;
     case Undo:
-        mWindow->hideSoftWareWithOutDeleteEmptyItems(); // as the button does first
+        m_window->hideSoftWareWithOutDeleteEmptyItems(); // as the button does first
         undoAction()->trigger();
         break;
     case Typed: {
@@ -335,19 +335,19 @@ void tst_titlerwindow_palette::happen(Event event, const QString& button)
         find<QAbstractButton>("PaletteCancel")->click();
         break;
     case MoveMode:
-        for (QPushButton* each : mWindow->findChildren<QPushButton*>())
+        for (QPushButton* each : m_window->findChildren<QPushButton*>())
             if (each->text() == TitlerWindow::tr("Move"))
                 each->click();
-        QVERIFY(mWindow->archiveListIsMoveMode());
+        QVERIFY(m_window->archiveListIsMoveMode());
         break;
     case Hidden:
-        mWindow->hide();
+        m_window->hide();
         break;
     case Close:
-        mWindow->closeTitlerWindow();
+        m_window->closeTitlerWindow();
         break;
     case PowerOff:
-        mWindow->slotPowerOff();
+        m_window->slotPowerOff();
         break;
     }
 }
@@ -391,11 +391,11 @@ void tst_titlerwindow_palette::previewLeavesNothing()
     if (QTest::currentTestFailed())
         return;
     QVERIFY(!palette()->isVisible());
-    if (mWindow->isVisible() && event != OtherTitleTapped)
+    if (m_window->isVisible() && event != OtherTitleTapped)
         QCOMPARE(colorsOnCanvas(), before);
-    if (mWindow->isVisible()) {
+    if (m_window->isVisible()) {
         palette()->reject(); // one that comes late has nothing to give back
-        mWindow->closeTitlerWindow();
+        m_window->closeTitlerWindow();
     }
     QCOMPARE(colorsOnDisk(), before);
     FontStyle last;
@@ -411,9 +411,9 @@ void tst_titlerwindow_palette::sliderIsCommittedFirst()
     find<QAbstractButton>("EdgeWidth")->click();
     QTRY_VERIFY(find<EdgeSizeSlider>()->isVisible());
     find<EdgeSizeSlider>()->slider()->setValue(9);
-    mWindow->slotPowerOff();
+    m_window->slotPowerOff();
     Archive archive;
-    QVERIFY(ArchiveController().getOneArchive(mFolder + "/a.xml", &archive));
+    QVERIFY(ArchiveController().getOneArchive(m_folder + "/a.xml", &archive));
     for (const TText* text : archive.text()) {
         for (const TextStyle* style : text->textItems())
             if (text->getTextObjectID() == 1)

@@ -154,23 +154,23 @@ private:
     QAction* action(const QString& name) const;
     Looks looksOfNewText(const QString& typed = QStringLiteral("x"));
     QStringList textsInFile(const QString& stem) const;
-    ArchiveList* list() const { return mWindow->findChild<ArchiveList*>(); }
-    CanvasScene* scene() const { return mWindow->findChild<CanvasScene*>(); }
-    GraphicsView* view() const { return mWindow->findChild<GraphicsView*>(); }
-    TextToolsPanel* panel() const { return mWindow->findChild<TextToolsPanel*>(); }
+    ArchiveList* list() const { return m_window->findChild<ArchiveList*>(); }
+    CanvasScene* scene() const { return m_window->findChild<CanvasScene*>(); }
+    GraphicsView* view() const { return m_window->findChild<GraphicsView*>(); }
+    TextToolsPanel* panel() const { return m_window->findChild<TextToolsPanel*>(); }
 
-    LibraryFixture mFixture;
-    Siblings mSiblings;
-    SoftKeyboardStandIn mKeyboard;
-    TouchDevice mDevice;
-    std::unique_ptr<TitlerWindow> mWindow;
-    QString mFolder;
-    Answers mAnswers;
+    LibraryFixture m_fixture;
+    Siblings m_siblings;
+    SoftKeyboardStandIn m_keyboard;
+    TouchDevice m_device;
+    std::unique_ptr<TitlerWindow> m_window;
+    QString m_folder;
+    Answers m_answers;
 };
 
 void tst_titlerwindow_texts::initTestCase()
 {
-    QVERIFY(mSiblings.listenOnFreePorts());
+    QVERIFY(m_siblings.listenOnFreePorts());
     Q_INIT_RESOURCE(UILibrary);
     Q_INIT_RESOURCE(TitlerToolResource);
 }
@@ -178,27 +178,27 @@ void tst_titlerwindow_texts::initTestCase()
 void tst_titlerwindow_texts::init()
 {
     APPEventFilter::instance();
-    mWindow = std::make_unique<TitlerWindow>(true, nullptr);
-    pMainWindow = mWindow.get();
-    mWindow->setRealClose(false);
-    KSInputContext::instance()->setKeyBoardController(&mKeyboard);
-    mFolder = mFixture.makeFolder(QStringLiteral("texts"));
-    LibraryFixture::fillFolder(mFolder, {"a", "b"});
-    const auto styled = LibraryFixture::makeRecord(mFolder, QStringLiteral("styled"), QStringLiteral("MMM"));
+    m_window = std::make_unique<TitlerWindow>(true, nullptr);
+    pMainWindow = m_window.get();
+    m_window->setRealClose(false);
+    KSInputContext::instance()->setKeyBoardController(&m_keyboard);
+    m_folder = m_fixture.makeFolder(QStringLiteral("texts"));
+    LibraryFixture::fillFolder(m_folder, {"a", "b"});
+    const auto styled = LibraryFixture::makeRecord(m_folder, QStringLiteral("styled"), QStringLiteral("MMM"));
     for (TextStyle* style : styled->text().front()->textItems())
         Looks().applyTo(*style);
     auto* other = LibraryFixture::makeText(QStringLiteral("other"), 2, 100, 500);
     other->textItems().front()->setFontSize(96);
     styled->setText({styled->text().front(), other});
-    ArchiveController().saveNewArchive(mFolder, styled.get());
-    LibraryFixture::writeOrder(mFolder, {"a", "b", "styled"});
+    ArchiveController().saveNewArchive(m_folder, styled.get());
+    LibraryFixture::writeOrder(m_folder, {"a", "b", "styled"});
     show();
 }
 
 void tst_titlerwindow_texts::show()
 {
-    mWindow->showTitlerWindow({_titler_paramter::CREATE_OR_EDIT, mFolder.toStdWString()});
-    QVERIFY(QTest::qWaitForWindowActive(mWindow.get(), PATIENCE_MS));
+    m_window->showTitlerWindow({_titler_paramter::CREATE_OR_EDIT, m_folder.toStdWString()});
+    QVERIFY(QTest::qWaitForWindowActive(m_window.get(), PATIENCE_MS));
     QTRY_VERIFY(list()->archiveItem(2) && list()->archiveItem(2)->hasChildWidgets());
     QCOMPARE(QFileInfo(list()->getSelectedArchive()->getArchiveDataPath()).completeBaseName(),
              QStringLiteral("a"));
@@ -208,16 +208,16 @@ void tst_titlerwindow_texts::cleanup()
 {
     EditContextController::getInstance()->resultCallBack(nullptr);
     EditContextController::getInstance()->setITitlerNoCallBack();
-    if (mWindow->isVisible())
-        mWindow->closeTitlerMainWindow();
-    mWindow.reset();
+    if (m_window->isVisible())
+        m_window->closeTitlerMainWindow();
+    m_window.reset();
     pMainWindow = nullptr;
     APPEventFilter::release();
 }
 
 void tst_titlerwindow_texts::tap(const QWidget* widget, const QPoint& place)
 {
-    mDevice.tap(mWindow.get(), widget->mapTo(mWindow.get(), place));
+    m_device.tap(m_window.get(), widget->mapTo(m_window.get(), place));
     view()->mouseClick(); // no double tap follows
 }
 
@@ -237,7 +237,7 @@ void tst_titlerwindow_texts::tapPanel(const char* name)
 
 QAction* tst_titlerwindow_texts::action(const QString& name) const
 {
-    const auto actions = mWindow->findChildren<QAction*>(QString(), Qt::FindDirectChildrenOnly);
+    const auto actions = m_window->findChildren<QAction*>(QString(), Qt::FindDirectChildrenOnly);
     for (QAction* found : actions)
         if (found->text().startsWith(name))
             return found;
@@ -258,48 +258,48 @@ void tst_titlerwindow_texts::take(Road road)
         break;
     }
     case FolderDialog: {
-        auto* dialog = mWindow->findChild<FolderPicker*>();
+        auto* dialog = m_window->findChild<FolderPicker*>();
         QTimer::singleShot(0, dialog, [dialog] { dialog->done(QDialog::Rejected); });
-        mWindow->openFolderDialog();
+        m_window->openFolderDialog();
         break;
     }
     case MoveMode:
-        for (KSPushbutton* button : mWindow->findChildren<KSPushbutton*>())
+        for (KSPushbutton* button : m_window->findChildren<KSPushbutton*>())
             if (button->text() == TitlerWindow::tr("Move"))
                 button->click();
-        QVERIFY(mWindow->archiveListIsMoveMode());
-        mWindow->slotChangeDoneToMoveMode();
+        QVERIFY(m_window->archiveListIsMoveMode());
+        m_window->slotChangeDoneToMoveMode();
         break;
     case UndoTapped:
-        Q_EMIT mWindow->findChild<ToolsBar*>()->undoButtonClicked();
+        Q_EMIT m_window->findChild<ToolsBar*>()->undoButtonClicked();
         action(QStringLiteral("Undo"))->trigger();
         break;
     case DeleteTapped:
-        mWindow->pressDelectButton();
+        m_window->pressDelectButton();
         break;
     case NewTextAgain:
-        mWindow->slotNewTextButtonClicked();
+        m_window->slotNewTextButtonClicked();
         break;
     case Close:
-        mWindow->closeTitlerWindow();
+        m_window->closeTitlerWindow();
         break;
     case CloseWithQuestion:
-        EditContextController::getInstance()->resultCallBack(new FakeTitlerCallBack(mAnswers));
+        EditContextController::getInstance()->resultCallBack(new FakeTitlerCallBack(m_answers));
         EditContextController::getInstance()->insertFilePath(L"new.xml");
-        mWindow->closeTitlerWindow();
+        m_window->closeTitlerWindow();
         break;
     case PowerOff:
         TitlerPowerController::getInstance()->powerOff();
         break;
     case Signal:
-        mWindow->endProcess();
+        m_window->endProcess();
         break;
     }
 }
 
 QStringList tst_titlerwindow_texts::textsInFile(const QString& stem) const
 {
-    QFile file(mFolder + '/' + stem + ".xml");
+    QFile file(m_folder + '/' + stem + ".xml");
     if (!file.open(QIODevice::ReadOnly))
         return {QStringLiteral("no file")};
     QStringList texts;
@@ -318,33 +318,33 @@ void tst_titlerwindow_texts::blankTextIsNotSaved_data()
 void tst_titlerwindow_texts::blankTextIsNotSaved()
 {
     QFETCH(Road, road);
-    mWindow->slotNewTextButtonClicked();
+    m_window->slotNewTextButtonClicked();
     QVERIFY(scene()->findTextItem(2));
-    mKeyboard.type(QStringLiteral(" \n "));
+    m_keyboard.type(QStringLiteral(" \n "));
     take(road);
     QCOMPARE(textsInFile(QStringLiteral("a")), QStringList{"a"});
-    if (mWindow->isVisible())
-        mWindow->closeTitlerWindow();
+    if (m_window->isVisible())
+        m_window->closeTitlerWindow();
     QCOMPARE(textsInFile(QStringLiteral("a")), QStringList{"a"});
 }
 
 void tst_titlerwindow_texts::undoneTextIsNotSavedAtClose()
 {
-    mWindow->slotNewTextButtonClicked();
+    m_window->slotNewTextButtonClicked();
     tap(view(), EMPTY_PLACE);
     QVERIFY(!scene()->findTextItem(2));
     take(UndoTapped);
     QVERIFY(scene()->findTextItem(2));
-    mWindow->closeTitlerWindow();
+    m_window->closeTitlerWindow();
     QCOMPARE(textsInFile(QStringLiteral("a")), QStringList{"a"});
 
     // Everything that was typed is taken back.
     show();
-    mWindow->slotNewTextButtonClicked();
-    mKeyboard.type(QStringLiteral("abc"));
+    m_window->slotNewTextButtonClicked();
+    m_keyboard.type(QStringLiteral("abc"));
     take(UndoTapped);
     QVERIFY(scene()->findTextItem(2) && scene()->findTextItem(2)->isBlank());
-    mWindow->closeTitlerWindow();
+    m_window->closeTitlerWindow();
     QCOMPARE(textsInFile(QStringLiteral("a")), QStringList{"a"});
 }
 
@@ -358,19 +358,19 @@ void tst_titlerwindow_texts::deletedOnlyTextStaysDeleted()
 {
     QFETCH(Road, road);
     tapText(1);
-    mWindow->pressDelectButton();
+    m_window->pressDelectButton();
     QVERIFY(scene()->getTextItemList().isEmpty());
     take(road);
     const QStringList wanted = road == UndoTapped ? QStringList{"a"} : QStringList();
     QCOMPARE(textsInFile(QStringLiteral("a")), wanted);
-    if (mWindow->isVisible())
-        mWindow->closeTitlerWindow();
-    mWindow->waitUntilSaved();
+    if (m_window->isVisible())
+        m_window->closeTitlerWindow();
+    m_window->waitUntilSaved();
     QCOMPARE(textsInFile(QStringLiteral("a")), wanted);
     if (road == UndoTapped)
         return;
     for (const char* picture : {"_1920.png", "_960.png"}) {
-        const QImage image = QImage(mFolder + "/a" + picture).convertToFormat(QImage::Format_ARGB32);
+        const QImage image = QImage(m_folder + "/a" + picture).convertToFormat(QImage::Format_ARGB32);
         QVERIFY2(!image.isNull(), picture);
         QImage empty(image.size(), image.format());
         empty.fill(Qt::transparent);
@@ -378,8 +378,9 @@ void tst_titlerwindow_texts::deletedOnlyTextStaysDeleted()
     }
     QImage black(240, 135, QImage::Format_RGB32);
     black.fill(Qt::black);
-    QCOMPARE(QImage(mFolder + "/a_240S.png").convertToFormat(QImage::Format_RGB32), black);
-    QCOMPARE(QImage(mFolder + "/a_240.png").convertToFormat(QImage::Format_RGB32), LibraryFixture::checker());
+    QCOMPARE(QImage(m_folder + "/a_240S.png").convertToFormat(QImage::Format_RGB32), black);
+    QCOMPARE(QImage(m_folder + "/a_240.png").convertToFormat(QImage::Format_RGB32),
+             LibraryFixture::checker());
 }
 
 void tst_titlerwindow_texts::keyboardIsPutAway_data()
@@ -393,17 +394,17 @@ void tst_titlerwindow_texts::keyboardIsPutAway()
     tapText(1);
     tapText(1);
     QVERIFY(scene()->itemIsEditorInteraction());
-    QVERIFY(mKeyboard.isUp());
-    mKeyboard.type(QStringLiteral("x"));
+    QVERIFY(m_keyboard.isUp());
+    m_keyboard.type(QStringLiteral("x"));
     take(road);
     if (road == NewTextAgain) {
-        QVERIFY(mKeyboard.isUp()); // for the new text
+        QVERIFY(m_keyboard.isUp()); // for the new text
         take(Close);
     }
-    QVERIFY(!mKeyboard.isUp());
+    QVERIFY(!m_keyboard.isUp());
     QVERIFY(KSInputContext::isSoftKeyboardClosed());
     if (road == CloseWithQuestion)
-        QVERIFY(mWindow->isVisible());
+        QVERIFY(m_window->isVisible());
 }
 
 void tst_titlerwindow_texts::sizeFieldsKeyboardIsPutAway_data()
@@ -419,22 +420,22 @@ void tst_titlerwindow_texts::sizeFieldsKeyboardIsPutAway()
     auto* box = panel()->findChild<QWidget*>(QStringLiteral("SizeBox"));
     QVERIFY(box);
     tap(box, QPoint(20, box->height() / 2));
-    QVERIFY(mKeyboard.isUp() && mKeyboard.isForLine());
+    QVERIFY(m_keyboard.isUp() && m_keyboard.isForLine());
     take(road);
     if (road == NewTextAgain) {
-        QVERIFY(mKeyboard.isUp() && !mKeyboard.isForLine());
+        QVERIFY(m_keyboard.isUp() && !m_keyboard.isForLine());
         return;
     }
-    QVERIFY(!mKeyboard.isUp());
-    mKeyboard.settle();
+    QVERIFY(!m_keyboard.isUp());
+    m_keyboard.settle();
     QVERIFY(KSInputContext::isSoftKeyboardClosed());
 }
 
 Looks tst_titlerwindow_texts::looksOfNewText(const QString& typed)
 {
-    mWindow->slotNewTextButtonClicked();
+    m_window->slotNewTextButtonClicked();
     const GraphicsText* item = scene()->getTextItemList().constLast();
-    mKeyboard.type(typed);
+    m_keyboard.type(typed);
     const auto& styles = item->getItemTText()->textItems();
     return styles.empty() ? Looks{0} : Looks::of(*styles.front());
 }
@@ -467,7 +468,7 @@ void tst_titlerwindow_texts::newTextLooksAsThePanelShows()
         tapText(1);
         break;
     case SelectedInNewLanguage:
-        mWindow->slotInputLanguageChanged(SystemSetupDef::emInputLanguageJapanese);
+        m_window->slotInputLanguageChanged(SystemSetupDef::emInputLanguageJapanese);
         tapText(1);
         break;
     }
@@ -480,16 +481,16 @@ void tst_titlerwindow_texts::newLanguageShowsItsFamily()
     const auto* family = panel()->findChild<QComboBox*>(QStringLiteral("FamilyBox"));
     QVERIFY(family);
     const QString before = family->currentText();
-    mWindow->slotInputLanguageChanged(SystemSetupDef::emInputLanguageUnknown);
+    m_window->slotInputLanguageChanged(SystemSetupDef::emInputLanguageUnknown);
     QCOMPARE(family->currentText(), before);
-    mWindow->slotInputLanguageChanged(SystemSetupDef::emInputLanguageJapanese);
+    m_window->slotInputLanguageChanged(SystemSetupDef::emInputLanguageJapanese);
     QCOMPARE(family->currentText(), QStringLiteral("KST Japanese Pro"));
     QCOMPARE(looksOfNewText(QString::fromUtf8("速")).family, std::string("KST Japanese Pro"));
     // A selected text is shown as it is.
     tap(view(), EMPTY_PLACE);
     tapText(1);
     const QString shown = family->currentText();
-    mWindow->slotInputLanguageChanged(SystemSetupDef::emInputLanguageKorean);
+    m_window->slotInputLanguageChanged(SystemSetupDef::emInputLanguageKorean);
     QCOMPARE(family->currentText(), shown);
 }
 
@@ -514,8 +515,8 @@ void tst_titlerwindow_texts::previewedColorIsNotTakenInTheNextSession()
     tapText(1);
     tapPanel("TextColor");
     panel()->findChild<ColorPalette*>()->findChildren<ColorButton*>().at(15)->click();
-    mWindow->closeTitlerWindow();
-    QVERIFY(!mWindow->isVisible());
+    m_window->closeTitlerWindow();
+    QVERIFY(!m_window->isVisible());
     show();
     QCOMPARE(looksOfNewText().color, remembered.color);
 }

@@ -47,16 +47,16 @@ private:
     // Signals of the object's own class with more or fewer receivers than there are rows for them.
     QStringList strangeSignals(const QObject* sender) const;
 
-    Siblings mSiblings;
-    TitlerWindow* mWindow = nullptr;
-    ToolsBar* mToolsBar = nullptr;
-    CanvasScene* mScene = nullptr;
-    TextToolsPanel* mPanel = nullptr;
-    ArchiveList* mList = nullptr;
-    FolderPicker* mFolders = nullptr;
-    TemplatePicker* mTemplates = nullptr;
-    QStringList mMissing;
-    QMap<QPair<const QObject*, QByteArray>, int> mRows; // by signal
+    Siblings m_siblings;
+    TitlerWindow* m_window = nullptr;
+    ToolsBar* m_toolsBar = nullptr;
+    CanvasScene* m_scene = nullptr;
+    TextToolsPanel* m_panel = nullptr;
+    ArchiveList* m_list = nullptr;
+    FolderPicker* m_folders = nullptr;
+    TemplatePicker* m_templates = nullptr;
+    QStringList m_missing;
+    QMap<QPair<const QObject*, QByteArray>, int> m_rows; // by signal
 };
 
 namespace
@@ -84,10 +84,10 @@ template <typename Sender, typename Signal, typename Receiver, typename Slot>
 void tst_titlerwindow_wiring::row(const char* name, const Sender* sender, Signal signal,
                                   const Receiver* receiver, Slot slot)
 {
-    ++mRows[{sender, QMetaMethod::fromSignal(signal).methodSignature()}];
+    ++m_rows[{sender, QMetaMethod::fromSignal(signal).methodSignature()}];
     if (const auto made = connect(sender, signal, receiver, slot, Qt::UniqueConnection)) {
         disconnect(made);
-        mMissing.append(QLatin1String(name));
+        m_missing.append(QLatin1String(name));
     }
 }
 
@@ -95,195 +95,197 @@ void tst_titlerwindow_wiring::row(const char* name, const Sender* sender, Signal
 
 void tst_titlerwindow_wiring::noRowIsMissing()
 {
-    const QStringList missing = std::exchange(mMissing, {});
+    const QStringList missing = std::exchange(m_missing, {});
     QVERIFY2(missing.isEmpty(), qPrintable(missing.join(QLatin1Char('\n'))));
 }
 
 void tst_titlerwindow_wiring::initTestCase()
 {
-    QVERIFY(mSiblings.listenOnFreePorts());
+    QVERIFY(m_siblings.listenOnFreePorts());
     APPEventFilter::instance();
     Q_INIT_RESOURCE(UILibrary);
     Q_INIT_RESOURCE(TitlerToolResource);
-    mWindow = new TitlerWindow(true, nullptr);
-    pMainWindow = mWindow;
-    mWindow->setRealClose(false);
-    mToolsBar = mWindow->findChild<ToolsBar*>();
-    mScene = mWindow->findChild<CanvasScene*>();
-    mPanel = mWindow->findChild<TextToolsPanel*>();
-    mList = mWindow->findChild<ArchiveList*>();
-    mFolders = mWindow->findChild<FolderPicker*>();
-    mTemplates = mWindow->findChild<TemplatePicker*>();
+    m_window = new TitlerWindow(true, nullptr);
+    pMainWindow = m_window;
+    m_window->setRealClose(false);
+    m_toolsBar = m_window->findChild<ToolsBar*>();
+    m_scene = m_window->findChild<CanvasScene*>();
+    m_panel = m_window->findChild<TextToolsPanel*>();
+    m_list = m_window->findChild<ArchiveList*>();
+    m_folders = m_window->findChild<FolderPicker*>();
+    m_templates = m_window->findChild<TemplatePicker*>();
     for (const QObject* child :
-         std::initializer_list<const QObject*>{mToolsBar, mScene, mPanel, mList, mFolders, mTemplates})
+         std::initializer_list<const QObject*>{m_toolsBar, m_scene, m_panel, m_list, m_folders, m_templates})
         QVERIFY(child);
 }
 
 void tst_titlerwindow_wiring::cleanupTestCase()
 {
-    delete mWindow;
+    delete m_window;
     pMainWindow = nullptr;
     APPEventFilter::release();
 }
 
 void tst_titlerwindow_wiring::aMissingRowIsNoticed()
 {
-    ROW(mToolsBar, ToolsBar::closeButtonClick, mWindow, TitlerWindow::clearUndoStack);
-    QCOMPARE(std::exchange(mMissing, {}),
+    ROW(m_toolsBar, ToolsBar::closeButtonClick, m_window, TitlerWindow::clearUndoStack);
+    QCOMPARE(std::exchange(m_missing, {}),
              QStringList{"ToolsBar::closeButtonClick -> TitlerWindow::clearUndoStack"});
     // The question itself has made nothing.
-    ROW(mToolsBar, ToolsBar::closeButtonClick, mWindow, TitlerWindow::clearUndoStack);
-    QCOMPARE(std::exchange(mMissing, {}).size(), 1);
+    ROW(m_toolsBar, ToolsBar::closeButtonClick, m_window, TitlerWindow::clearUndoStack);
+    QCOMPARE(std::exchange(m_missing, {}).size(), 1);
 }
 
 void tst_titlerwindow_wiring::toolsBar()
 {
-    ROW(mToolsBar, ToolsBar::closeButtonClick, mWindow, TitlerWindow::closeTitlerWindow);
-    ROW(mToolsBar, ToolsBar::folderButtonClick, mWindow, TitlerWindow::openFolderDialog);
-    ROW(mToolsBar, ToolsBar::redoButtonClicked, mWindow, TitlerWindow::hideSoftWareWithOutDeleteEmptyItems);
-    ROW(mToolsBar, ToolsBar::undoButtonClicked, mWindow, TitlerWindow::hideSoftWareWithOutDeleteEmptyItems);
-    ROW(mToolsBar, ToolsBar::canvasButtonClicked, mWindow, TitlerWindow::slotCanvasButtonClicked);
-    ROW(mToolsBar, ToolsBar::newTextButtonClick, mWindow, TitlerWindow::slotNewTextButtonClicked);
-    ROW(mToolsBar, ToolsBar::deleteButtonClick, mWindow, TitlerWindow::pressDelectButton);
-    ROW(mToolsBar, ToolsBar::SafeAreaButtonClickedForDrawRect, mScene, CanvasScene::slotDrawSafeArea);
-    ROW(mToolsBar, ToolsBar::canvasButtonClicked, mScene, CanvasScene::slotShowCanvasBG);
-    ROW(mToolsBar, ToolsBar::signalShowCanvasMenu, mWindow, TitlerWindow::slotShowCanvasMenu);
-    ROW(mToolsBar, ToolsBar::signalShowCanvasMenu, mPanel, TextToolsPanel::slotAbsoluteShowCanvasMenu);
+    ROW(m_toolsBar, ToolsBar::closeButtonClick, m_window, TitlerWindow::closeTitlerWindow);
+    ROW(m_toolsBar, ToolsBar::folderButtonClick, m_window, TitlerWindow::openFolderDialog);
+    ROW(m_toolsBar, ToolsBar::redoButtonClicked, m_window, TitlerWindow::hideSoftWareWithOutDeleteEmptyItems);
+    ROW(m_toolsBar, ToolsBar::undoButtonClicked, m_window, TitlerWindow::hideSoftWareWithOutDeleteEmptyItems);
+    ROW(m_toolsBar, ToolsBar::canvasButtonClicked, m_window, TitlerWindow::slotCanvasButtonClicked);
+    ROW(m_toolsBar, ToolsBar::newTextButtonClick, m_window, TitlerWindow::slotNewTextButtonClicked);
+    ROW(m_toolsBar, ToolsBar::deleteButtonClick, m_window, TitlerWindow::pressDelectButton);
+    ROW(m_toolsBar, ToolsBar::SafeAreaButtonClickedForDrawRect, m_scene, CanvasScene::slotDrawSafeArea);
+    ROW(m_toolsBar, ToolsBar::canvasButtonClicked, m_scene, CanvasScene::slotShowCanvasBG);
+    ROW(m_toolsBar, ToolsBar::signalShowCanvasMenu, m_window, TitlerWindow::slotShowCanvasMenu);
+    ROW(m_toolsBar, ToolsBar::signalShowCanvasMenu, m_panel, TextToolsPanel::slotAbsoluteShowCanvasMenu);
     noRowIsMissing();
 }
 
 void tst_titlerwindow_wiring::canvas()
 {
-    ROW(mScene, CanvasScene::signalTextInserted, mToolsBar, ToolsBar::setInsertUnchecked);
-    ROW(mScene, CanvasScene::signalSceneNotifyIfExistSelectedObject, mToolsBar, ToolsBar::changeBtnStatus);
-    ROW(mScene, CanvasScene::signalDisableNewTextButton, mToolsBar, ToolsBar::slotDisableNewTextButton);
-    ROW(mScene, CanvasScene::signalCanvasSceneMousePressed, mToolsBar,
+    ROW(m_scene, CanvasScene::signalTextInserted, m_toolsBar, ToolsBar::setInsertUnchecked);
+    ROW(m_scene, CanvasScene::signalSceneNotifyIfExistSelectedObject, m_toolsBar, ToolsBar::changeBtnStatus);
+    ROW(m_scene, CanvasScene::signalDisableNewTextButton, m_toolsBar, ToolsBar::slotDisableNewTextButton);
+    ROW(m_scene, CanvasScene::signalCanvasSceneMousePressed, m_toolsBar,
         ToolsBar::slotlCanvasSceneMousePressed);
-    ROW(mScene, CanvasScene::signalHasMessageToShowInformation, mWindow,
+    ROW(m_scene, CanvasScene::signalHasMessageToShowInformation, m_window,
         TitlerWindow::setHasMessageToShowInformation);
-    ROW(mScene, CanvasScene::signalNewTextInsertedFailed, mWindow,
+    ROW(m_scene, CanvasScene::signalNewTextInsertedFailed, m_window,
         TitlerWindow::hideSoftWareWithDeleteEmptyItems);
-    ROW(mScene, CanvasScene::signalSaveOk, mList, ArchiveList::refreshBaseItem);
-    ROW(mScene, CanvasScene::signalStartEditTextItem, mList, ArchiveList::moveCurrentArchiveItemVisble);
-    ROW(mScene, CanvasScene::signalPushUndoCommandIntoStack, mWindow, TitlerWindow::pushUndoStack);
-    auto* view = mWindow->findChild<GraphicsView*>();
+    ROW(m_scene, CanvasScene::signalSaveOk, m_list, ArchiveList::refreshBaseItem);
+    ROW(m_scene, CanvasScene::signalStartEditTextItem, m_list, ArchiveList::moveCurrentArchiveItemVisble);
+    ROW(m_scene, CanvasScene::signalPushUndoCommandIntoStack, m_window, TitlerWindow::pushUndoStack);
+    auto* view = m_window->findChild<GraphicsView*>();
     QVERIFY(view);
-    ROW(view, GraphicsView::deleteEmptyItem, mWindow, TitlerWindow::slotDeleteEmptyItems);
+    ROW(view, GraphicsView::deleteEmptyItem, m_window, TitlerWindow::slotDeleteEmptyItems);
     noRowIsMissing();
 }
 
 void tst_titlerwindow_wiring::panel()
 {
-    ROW(mScene, CanvasScene::signalSceneNotifyIfExistSelectedObject, mPanel,
+    ROW(m_scene, CanvasScene::signalSceneNotifyIfExistSelectedObject, m_panel,
         TextToolsPanel::changeFontPropertyBtnStatus);
-    ROW(mScene, CanvasScene::signalNotifyPropertyAreaUpdateCurrentTextStyle, mPanel,
+    ROW(m_scene, CanvasScene::signalNotifyPropertyAreaUpdateCurrentTextStyle, m_panel,
         TextToolsPanel::updateTextStyle);
-    ROW(mScene, CanvasScene::signalSceneNotifyTextPropertyAreaObjectSelectionMode, mPanel,
+    ROW(m_scene, CanvasScene::signalSceneNotifyTextPropertyAreaObjectSelectionMode, m_panel,
         TextToolsPanel::selectionModeForShadowAndAlign);
-    ROW(mScene, CanvasScene::signalBeginNewTextItem, mPanel, TextToolsPanel::slotBeginNewTextItem);
-    ROW(mScene, CanvasScene::signalEndPreview, mPanel, TextToolsPanel::slotEndPreview);
-    ROW(mScene, CanvasScene::signalSceneSoftWareClosedWhenEditObject, mPanel,
+    ROW(m_scene, CanvasScene::signalBeginNewTextItem, m_panel, TextToolsPanel::slotBeginNewTextItem);
+    ROW(m_scene, CanvasScene::signalEndPreview, m_panel, TextToolsPanel::slotEndPreview);
+    ROW(m_scene, CanvasScene::signalSceneSoftWareClosedWhenEditObject, m_panel,
         TextToolsPanel::slotHideColorPaletteWhenCloseSoftWare);
-    ROW(mPanel, TextToolsPanel::signalShowEdgeSlider, mWindow, TitlerWindow::slotShowEdgeSlider);
-    ROW(mPanel, TextToolsPanel::signalShowFontFamilyComboxList, mWindow,
+    ROW(m_panel, TextToolsPanel::signalShowEdgeSlider, m_window, TitlerWindow::slotShowEdgeSlider);
+    ROW(m_panel, TextToolsPanel::signalShowFontFamilyComboxList, m_window,
         TitlerWindow::slotShowFontFamilyComboxList);
-    ROW(mPanel, TextToolsPanel::signalShowFontSizeComboxList, mWindow,
+    ROW(m_panel, TextToolsPanel::signalShowFontSizeComboxList, m_window,
         TitlerWindow::slotShowFontSizeComboxList);
-    ROW(mPanel, TextToolsPanel::signalNotifyEditAreaSizeToolBoxEditDone, mScene,
+    ROW(m_panel, TextToolsPanel::signalNotifyEditAreaSizeToolBoxEditDone, m_scene,
         CanvasScene::slotNotifyEditAreaSizeToolBoxEditDone);
-    ROW(mPanel, TextToolsPanel::textStyleChange, mScene, CanvasScene::slotChangeObjectTextStyle);
-    ROW(mPanel, TextToolsPanel::signalUpdateCurrentTextProperty, mScene,
+    ROW(m_panel, TextToolsPanel::textStyleChange, m_scene, CanvasScene::slotChangeObjectTextStyle);
+    ROW(m_panel, TextToolsPanel::signalUpdateCurrentTextProperty, m_scene,
         CanvasScene::slotUpdateCurrentTextProperty);
-    ROW(mWindow, TitlerWindow::modifyFontComboxItem, mPanel, TextToolsPanel::modifyFontFamilyComboxItem);
-    ROW(mWindow, TitlerWindow::titlerWindowGeometry, mPanel, TextToolsPanel::titlerWindowRectSlot);
+    ROW(m_window, TitlerWindow::modifyFontComboxItem, m_panel, TextToolsPanel::modifyFontFamilyComboxItem);
+    ROW(m_window, TitlerWindow::titlerWindowGeometry, m_panel, TextToolsPanel::titlerWindowRectSlot);
     noRowIsMissing();
 }
 
 void tst_titlerwindow_wiring::list()
 {
-    ROW(mList, ArchiveList::signalUpdateCanvas, mScene, CanvasScene::slotUpdateArchive);
-    ROW(mList, ArchiveList::itemSetDefaultState, mScene, CanvasScene::slotMakeSceneThumnail);
-    ROW(mList, ArchiveList::startTemplatePicker, mWindow, TitlerWindow::showTemplateDialog);
-    ROW(mList, ArchiveList::startUserTemplatePicker, mWindow, TitlerWindow::showTemplateDialogOnUser);
-    ROW(mList, ArchiveList::cleanUndoStack, mWindow, TitlerWindow::clearUndoStack);
-    ROW(mList, ArchiveList::widgetItemReleased, mWindow, TitlerWindow::listWidgetReleasedEvent);
-    ROW(mList, ArchiveList::archiveListMenuShow, mWindow, TitlerWindow::hideSoftWareWithDeleteEmptyItems);
-    ROW(mList, ArchiveList::signalStartPasteArchive, mWindow, TitlerWindow::slotStartPasteArchive);
-    ROW(mList, ArchiveList::deleteCommandSignal, mWindow, TitlerWindow::pushUndoStack);
-    ROW(mList, ArchiveList::pasteCommandSignal, mWindow, TitlerWindow::pushUndoStack);
-    ROW(mList, ArchiveList::focusCommandSignal, mWindow, TitlerWindow::pushUndoStack);
-    ROW(mList, ArchiveList::moveCommandSignal, mWindow, TitlerWindow::pushUndoStack);
-    ROW(mWindow, TitlerWindow::moveButtonClicked, mList, ArchiveList::moveButtonClicked);
+    ROW(m_list, ArchiveList::signalUpdateCanvas, m_scene, CanvasScene::slotUpdateArchive);
+    ROW(m_list, ArchiveList::itemSetDefaultState, m_scene, CanvasScene::slotMakeSceneThumnail);
+    ROW(m_list, ArchiveList::startTemplatePicker, m_window, TitlerWindow::showTemplateDialog);
+    ROW(m_list, ArchiveList::startUserTemplatePicker, m_window, TitlerWindow::showTemplateDialogOnUser);
+    ROW(m_list, ArchiveList::cleanUndoStack, m_window, TitlerWindow::clearUndoStack);
+    ROW(m_list, ArchiveList::widgetItemReleased, m_window, TitlerWindow::listWidgetReleasedEvent);
+    ROW(m_list, ArchiveList::archiveListMenuShow, m_window, TitlerWindow::hideSoftWareWithDeleteEmptyItems);
+    ROW(m_list, ArchiveList::signalStartPasteArchive, m_window, TitlerWindow::slotStartPasteArchive);
+    ROW(m_list, ArchiveList::deleteCommandSignal, m_window, TitlerWindow::pushUndoStack);
+    ROW(m_list, ArchiveList::pasteCommandSignal, m_window, TitlerWindow::pushUndoStack);
+    ROW(m_list, ArchiveList::focusCommandSignal, m_window, TitlerWindow::pushUndoStack);
+    ROW(m_list, ArchiveList::moveCommandSignal, m_window, TitlerWindow::pushUndoStack);
+    ROW(m_window, TitlerWindow::moveButtonClicked, m_list, ArchiveList::moveButtonClicked);
     KSPushbutton* moveButton = nullptr;
-    const auto buttons = mWindow->findChildren<KSPushbutton*>();
+    const auto buttons = m_window->findChildren<KSPushbutton*>();
     for (KSPushbutton* button : buttons)
-        if (button->text() == mWindow->tr("Move"))
+        if (button->text() == m_window->tr("Move"))
             moveButton = button;
     QVERIFY(moveButton);
-    ROW(moveButton, QPushButton::clicked, mWindow, TitlerWindow::hideSoftWareWithDeleteEmptyItems);
-    ROW(moveButton, QPushButton::clicked, mWindow, TitlerWindow::editAndDoneButtonClicked);
-    ROW(moveButton, QPushButton::pressed, mWindow, TitlerWindow::moveButtonPressed);
-    ROW(moveButton, QPushButton::released, mWindow, TitlerWindow::moveButtonReleased);
+    ROW(moveButton, QPushButton::clicked, m_window, TitlerWindow::hideSoftWareWithDeleteEmptyItems);
+    ROW(moveButton, QPushButton::clicked, m_window, TitlerWindow::editAndDoneButtonClicked);
+    ROW(moveButton, QPushButton::pressed, m_window, TitlerWindow::moveButtonPressed);
+    ROW(moveButton, QPushButton::released, m_window, TitlerWindow::moveButtonReleased);
     noRowIsMissing();
 }
 
 void tst_titlerwindow_wiring::dialogs()
 {
-    ROW(mFolders, FolderPicker::clearUndoCommandStack, mWindow, TitlerWindow::clearUndoStack);
-    ROW(mFolders, FolderPicker::signalCancelClicked, mWindow, TitlerWindow::slotCancelClicked);
-    ROW(mFolders, FolderPicker::changeFolderPath, mList, ArchiveList::refreshArchiveList);
-    ROW(mFolders, FolderPicker::changeFolderFile, mList, ArchiveList::refreshArchiveListInFile);
-    ROW(mFolders, FolderPicker::folderMoved, mScene, CanvasScene::folderRenamed);
-    ROW(mFolders, FolderPicker::folderNameChange, mList, ArchiveList::refreshArchiveListForChangeFolderName);
-    ROW(mTemplates, TemplatePicker::selectedTemplate, mWindow,
+    ROW(m_folders, FolderPicker::clearUndoCommandStack, m_window, TitlerWindow::clearUndoStack);
+    ROW(m_folders, FolderPicker::signalCancelClicked, m_window, TitlerWindow::slotCancelClicked);
+    ROW(m_folders, FolderPicker::changeFolderPath, m_list, ArchiveList::refreshArchiveList);
+    ROW(m_folders, FolderPicker::changeFolderFile, m_list, ArchiveList::refreshArchiveListInFile);
+    ROW(m_folders, FolderPicker::folderMoved, m_scene, CanvasScene::folderRenamed);
+    ROW(m_folders, FolderPicker::folderNameChange, m_list,
+        ArchiveList::refreshArchiveListForChangeFolderName);
+    ROW(m_templates, TemplatePicker::selectedTemplate, m_window,
         TitlerWindow::slotStartCreateNewArchiveFromTemplate);
-    ROW(mTemplates, TemplatePicker::signalCloseSoftwareKeyBoardForFileManager, mFolders,
+    ROW(m_templates, TemplatePicker::signalCloseSoftwareKeyBoardForFileManager, m_folders,
         FolderPicker::slotCloseSoftwareKeyBoardForFileManager);
-    ROW(mList, ArchiveList::addUserSignal, mTemplates, TemplatePicker::slotSaveAsTemplate);
+    ROW(m_list, ArchiveList::addUserSignal, m_templates, TemplatePicker::slotSaveAsTemplate);
     noRowIsMissing();
 }
 
 void tst_titlerwindow_wiring::controllers()
 {
-    ROW(ShowTitlerController::getInstance(), ShowTitlerController::signalShowTitlerParameter, mWindow,
+    ROW(ShowTitlerController::getInstance(), ShowTitlerController::signalShowTitlerParameter, m_window,
         TitlerWindow::showTitlerWindow);
-    ROW(EditContextController::getInstance(), EditContextController::signalShowTitlerParameter, mWindow,
+    ROW(EditContextController::getInstance(), EditContextController::signalShowTitlerParameter, m_window,
         TitlerWindow::showTitlerWindow);
     auto* setup = SystemSetupInfoController::getInstance();
-    ROW(setup, SystemSetupInfoController::signalsInputLanguageInfo, mWindow,
+    ROW(setup, SystemSetupInfoController::signalsInputLanguageInfo, m_window,
         TitlerWindow::slotInputLanguageChanged);
-    ROW(setup, SystemSetupInfoController::signalsSystemLanguageInfo, mWindow,
+    ROW(setup, SystemSetupInfoController::signalsSystemLanguageInfo, m_window,
         TitlerWindow::slotSystemLanguageChanged);
-    ROW(setup, SystemSetupInfoController::signalsSystemInfo, mWindow, TitlerWindow::slotGetModuleInfo);
-    ROW(TitlerPowerController::getInstance(), TitlerPowerController::signalPowerOff, mWindow,
+    ROW(setup, SystemSetupInfoController::signalsSystemInfo, m_window, TitlerWindow::slotGetModuleInfo);
+    ROW(TitlerPowerController::getInstance(), TitlerPowerController::signalPowerOff, m_window,
         TitlerWindow::slotPowerOff);
     auto* locks = TitlerAPPEventFilterController::getInstance();
-    ROW(locks, TitlerAPPEventFilterController::signalRestoreOriginal, mWindow,
+    ROW(locks, TitlerAPPEventFilterController::signalRestoreOriginal, m_window,
         TitlerWindow::slotCancelArchiveListMoveMode);
-    ROW(locks, TitlerAPPEventFilterController::signalRestoreOriginal, mWindow,
+    ROW(locks, TitlerAPPEventFilterController::signalRestoreOriginal, m_window,
         TitlerWindow::slotHideEdgeSlider);
-    ROW(locks, TitlerAPPEventFilterController::signalRestoreOriginal, mWindow,
+    ROW(locks, TitlerAPPEventFilterController::signalRestoreOriginal, m_window,
         TitlerWindow::slotHideCanvasMenu);
-    ROW(locks, TitlerAPPEventFilterController::signalRestoreOriginal, mWindow,
+    ROW(locks, TitlerAPPEventFilterController::signalRestoreOriginal, m_window,
         TitlerWindow::slotHideFontFamilyComboxList);
-    ROW(locks, TitlerAPPEventFilterController::signalRestoreOriginal, mWindow,
+    ROW(locks, TitlerAPPEventFilterController::signalRestoreOriginal, m_window,
         TitlerWindow::slotHideFontSizeComboxList);
     auto* messages = ShowMessageController::getInstance();
-    ROW(messages, ShowMessageController::signalsShowDialogMaskWidget, mWindow,
+    ROW(messages, ShowMessageController::signalsShowDialogMaskWidget, m_window,
         TitlerWindow::slotShowDialogMaskWidget);
-    ROW(messages, ShowMessageController::signalsShowMessageMaskWidget, mWindow,
+    ROW(messages, ShowMessageController::signalsShowMessageMaskWidget, m_window,
         TitlerWindow::slotShowMessageMaskWidget);
-    ROW(MessageBoxController::getInstance(), MessageBoxController::signalCloseMessage, mWindow,
+    ROW(MessageBoxController::getInstance(), MessageBoxController::signalCloseMessage, m_window,
         TitlerWindow::continueCloseTitler);
     auto* files = EditTitlerController::getInstance();
-    ROW(files, EditTitlerController::importNewFontFamilies, mPanel, TextToolsPanel::slotImportNewFontFamlies);
-    ROW(files, EditTitlerController::folderNameChangeFromFileManager, mFolders,
+    ROW(files, EditTitlerController::importNewFontFamilies, m_panel,
+        TextToolsPanel::slotImportNewFontFamlies);
+    ROW(files, EditTitlerController::folderNameChangeFromFileManager, m_folders,
         FolderPicker::folderNameChanged);
-    ROW(files, EditTitlerController::folderDeleteFromFileManager, mFolders, FolderPicker::slotDeleteFolder);
-    ROW(files, EditTitlerController::importNewUserTemplate, mTemplates,
+    ROW(files, EditTitlerController::folderDeleteFromFileManager, m_folders, FolderPicker::slotDeleteFolder);
+    ROW(files, EditTitlerController::importNewUserTemplate, m_templates,
         TemplatePicker::slotImportNewUserTemplate);
-    ROW(files, EditTitlerController::deleteUserTemplate, mTemplates, TemplatePicker::slotDeleteUserTemplate);
-    ROW(files, EditTitlerController::renameUserTemplate, mTemplates, TemplatePicker::slotRenameUserTemplate);
+    ROW(files, EditTitlerController::deleteUserTemplate, m_templates, TemplatePicker::slotDeleteUserTemplate);
+    ROW(files, EditTitlerController::renameUserTemplate, m_templates, TemplatePicker::slotRenameUserTemplate);
     noRowIsMissing();
 }
 
@@ -296,7 +298,7 @@ QStringList tst_titlerwindow_wiring::strangeSignals(const QObject* sender) const
         const QString name = QLatin1String(type->className()) + "::" + QLatin1String(method.name());
         if (method.methodType() != QMetaMethod::Signal || INTERNAL.contains(name))
             continue;
-        const int wanted = mRows.value({sender, method.methodSignature()});
+        const int wanted = m_rows.value({sender, method.methodSignature()});
         const int made = Receivers::count(sender, method);
         if (made != wanted)
             strange.append(QStringLiteral("%1: %2 instead of %3").arg(name).arg(made).arg(wanted));
@@ -306,7 +308,7 @@ QStringList tst_titlerwindow_wiring::strangeSignals(const QObject* sender) const
 
 void tst_titlerwindow_wiring::thereAreNoOthers()
 {
-    mRows.clear();
+    m_rows.clear();
     toolsBar();
     canvas();
     panel();
@@ -315,16 +317,16 @@ void tst_titlerwindow_wiring::thereAreNoOthers()
     controllers();
     QStringList strange;
     for (const QObject* sender : std::initializer_list<const QObject*>{
-             mWindow, mToolsBar, mScene, mPanel, mList, mFolders, mTemplates,
+             m_window, m_toolsBar, m_scene, m_panel, m_list, m_folders, m_templates,
              ShowTitlerController::getInstance(), EditContextController::getInstance(),
              SystemSetupInfoController::getInstance(), TitlerPowerController::getInstance(),
              ShowMessageController::getInstance(), EditTitlerController::getInstance()})
         strange.append(strangeSignals(sender));
     QVERIFY2(strange.isEmpty(), qPrintable(strange.join(QLatin1Char('\n'))));
     // A row that is made twice is seen, too.
-    connect(mToolsBar, &ToolsBar::closeButtonClick, mWindow, &TitlerWindow::clearUndoStack);
-    QCOMPARE(strangeSignals(mToolsBar), QStringList{"ToolsBar::closeButtonClick: 2 instead of 1"});
-    disconnect(mToolsBar, &ToolsBar::closeButtonClick, mWindow, &TitlerWindow::clearUndoStack);
+    connect(m_toolsBar, &ToolsBar::closeButtonClick, m_window, &TitlerWindow::clearUndoStack);
+    QCOMPARE(strangeSignals(m_toolsBar), QStringList{"ToolsBar::closeButtonClick: 2 instead of 1"});
+    disconnect(m_toolsBar, &ToolsBar::closeButtonClick, m_window, &TitlerWindow::clearUndoStack);
 }
 
 QTEST_MAIN(tst_titlerwindow_wiring)

@@ -61,7 +61,7 @@ private:
     void inDialog(const std::function<void()>& open, const std::function<void()>& steps);
     void request(const QString& path, int mode = _titler_paramter::CREATE_OR_EDIT)
     {
-        mWindow->showTitlerWindow({mode, path.toStdWString()});
+        m_window->showTitlerWindow({mode, path.toStdWString()});
     }
     void choose(const QString& name)
     {
@@ -91,30 +91,30 @@ private:
                 return true;
         return false;
     }
-    FolderPicker* picker() const { return mWindow->findChild<FolderPicker*>(); }
+    FolderPicker* picker() const { return m_window->findChild<FolderPicker*>(); }
     KSTreeView* tree() const { return picker()->treeView(); }
-    ArchiveList* list() const { return mWindow->findChild<ArchiveList*>(); }
-    QString path(const QString& name) const { return mFiles.titleRoot() + QLatin1Char('/') + name; }
+    ArchiveList* list() const { return m_window->findChild<ArchiveList*>(); }
+    QString path(const QString& name) const { return m_files.titleRoot() + QLatin1Char('/') + name; }
 
-    LibraryFixture mFiles;
-    Siblings mSiblings;
-    TitlerWindow* mWindow = nullptr;
+    LibraryFixture m_files;
+    Siblings m_siblings;
+    TitlerWindow* m_window = nullptr;
 };
 
 void tst_windowdialogs_folder::initTestCase()
 {
-    QVERIFY(mSiblings.listenOnFreePorts());
+    QVERIFY(m_siblings.listenOnFreePorts());
     APPEventFilter::instance();
     Q_INIT_RESOURCE(UILibrary);
     Q_INIT_RESOURCE(TitlerToolResource);
-    mWindow = new TitlerWindow(true, nullptr);
-    pMainWindow = mWindow;
-    mWindow->setRealClose(false);
+    m_window = new TitlerWindow(true, nullptr);
+    pMainWindow = m_window;
+    m_window->setRealClose(false);
 }
 
 void tst_windowdialogs_folder::cleanupTestCase()
 {
-    delete mWindow;
+    delete m_window;
     pMainWindow = nullptr;
     APPEventFilter::release();
 }
@@ -123,9 +123,9 @@ void tst_windowdialogs_folder::init()
 {
     QVERIFY(FileSyncQueue::flush(
         std::chrono::milliseconds(PATIENCE_MS))); // keeps versions in the folders until then
-    QVERIFY(QDir(mFiles.titleRoot()).removeRecursively());
-    LibraryFixture::fillFolder(mFiles.makeFolder("news"), {"t1", "t2"});
-    LibraryFixture::fillFolder(mFiles.makeFolder("sports"), {"t3"});
+    QVERIFY(QDir(m_files.titleRoot()).removeRecursively());
+    LibraryFixture::fillFolder(m_files.makeFolder("news"), {"t1", "t2"});
+    LibraryFixture::fillFolder(m_files.makeFolder("sports"), {"t3"});
 }
 
 void tst_windowdialogs_folder::cleanup()
@@ -133,9 +133,9 @@ void tst_windowdialogs_folder::cleanup()
     EditContextController::getInstance()->setITitlerNoCallBack();
     if (picker()->isVisible())
         picker()->done(QDialog::Rejected);
-    if (mWindow->isVisible())
-        mWindow->closeTitlerWindow();
-    QVERIFY(!mWindow->isVisible());
+    if (m_window->isVisible())
+        m_window->closeTitlerWindow();
+    QVERIFY(!m_window->isVisible());
     QVERIFY(picker()->currentFolderName().isEmpty());
 }
 
@@ -151,7 +151,7 @@ void tst_windowdialogs_folder::inDialog(const std::function<void()>& open, const
     open();
     QVERIFY(ran);
     QVERIFY(!picker()->isVisible());
-    QVERIFY(!isMasked(mWindow));
+    QVERIFY(!isMasked(m_window));
 }
 
 void tst_windowdialogs_folder::createRequestAsksForAFolder()
@@ -159,9 +159,9 @@ void tst_windowdialogs_folder::createRequestAsksForAFolder()
     EditContextController::getInstance()->showTitlerEdit({});
     inDialog([this] { request(QString()); },
              [this] {
-                 QVERIFY(mWindow->isVisible());
+                 QVERIFY(m_window->isVisible());
                  QCOMPARE(picker()->windowModality(), Qt::WindowModal);
-                 QVERIFY(isMasked(mWindow));
+                 QVERIFY(isMasked(m_window));
                  QVERIFY(!button("duplicateFolderButton")->isEnabled());
                  QVERIFY(!button("newFolderButton")->isEnabled());
                  QVERIFY(!button("openFolderButton")->isEnabled());
@@ -170,20 +170,20 @@ void tst_windowdialogs_folder::createRequestAsksForAFolder()
                  press("openFolderButton");
                  QCOMPARE(list()->getCurrentPath(), path("sports"));
              });
-    QVERIFY(mWindow->isVisible());
+    QVERIFY(m_window->isVisible());
     QCOMPARE(list()->count(), 1);
     QCOMPARE(picker()->currentFolderName(), QStringLiteral("sports"));
 }
 
 void tst_windowdialogs_folder::createRequestIsCancelled()
 {
-    mSiblings.forget();
+    m_siblings.forget();
     inDialog([this] { request(QString()); }, [this] { press("cancelFolderButton"); });
-    QVERIFY(!mWindow->isVisible());
+    QVERIFY(!m_window->isVisible());
     QVERIFY(list()->getCurrentPath().isEmpty());
     // The next request is not dropped.
     request(path("news"));
-    QVERIFY(mWindow->isVisible());
+    QVERIFY(m_window->isVisible());
     QCOMPARE(list()->getCurrentPath(), path("news"));
 }
 
@@ -209,24 +209,24 @@ void tst_windowdialogs_folder::folderButtonOpensItFromTheEditor()
                  choose("news");
                  press("openFolderButton");
              });
-    mWindow->pushUndoStack(new QUndoCommand);
-    inDialog([this] { QMetaObject::invokeMethod(mWindow->findChild<ToolsBar*>(), "folderButtonClick"); },
+    m_window->pushUndoStack(new QUndoCommand);
+    inDialog([this] { QMetaObject::invokeMethod(m_window->findChild<ToolsBar*>(), "folderButtonClick"); },
              [this] {
                  choose("sports");
                  press("openFolderButton");
              });
-    QVERIFY(mWindow->isVisible());
+    QVERIFY(m_window->isVisible());
     QCOMPARE(list()->getCurrentPath(), path("sports"));
-    mWindow->closeTitlerWindow();
-    mWindow->openFolderDialog(); // nothing shows for a hidden window
+    m_window->closeTitlerWindow();
+    m_window->openFolderDialog(); // nothing shows for a hidden window
     QVERIFY(!picker()->isVisible());
 }
 
 void tst_windowdialogs_folder::cancelGoesBackToTheEditor()
 {
     request(path("news"));
-    inDialog([this] { mWindow->openFolderDialog(); }, [this] { press("cancelFolderButton"); });
-    QVERIFY(mWindow->isVisible());
+    inDialog([this] { m_window->openFolderDialog(); }, [this] { press("cancelFolderButton"); });
+    QVERIFY(m_window->isVisible());
     QCOMPARE(list()->getCurrentPath(), path("news"));
     QCOMPARE(list()->count(), 2);
 }
@@ -235,7 +235,7 @@ void tst_windowdialogs_folder::anEmptyListHasNoWayBack()
 {
     request(path("news"));
     list()->cleanArchiveList();
-    inDialog([this] { mWindow->openFolderDialog(); },
+    inDialog([this] { m_window->openFolderDialog(); },
              [this] {
                  QVERIFY(!button("cancelFolderButton")->isEnabled());
                  picker()->reject();
@@ -249,12 +249,12 @@ void tst_windowdialogs_folder::anEmptyListHasNoWayBack()
 void tst_windowdialogs_folder::theOpenFolderTakesNoName()
 {
     request(path("news"));
-    inDialog([this] { mWindow->openFolderDialog(); },
+    inDialog([this] { m_window->openFolderDialog(); },
              [this] {
                  QVERIFY(!row("news").data(34).toBool());
                  QVERIFY(row("sports").data(34).toBool());
              });
-    mWindow->closeTitlerWindow();
+    m_window->closeTitlerWindow();
     inDialog([this] { request(QString(), _titler_paramter::SUB_PANEL); },
              [this] {
                  QVERIFY(row("news").data(34).toBool());
@@ -267,7 +267,7 @@ void tst_windowdialogs_folder::noticesOfTheFileManager()
     EditTitlerController* files = EditTitlerController::getInstance();
     inDialog([this] { request(QString()); },
              [this, files] {
-                 QVERIFY(QDir(mFiles.titleRoot()).rename("news", QStringLiteral("速報")));
+                 QVERIFY(QDir(m_files.titleRoot()).rename("news", QStringLiteral("速報")));
                  files->updateFolderNameInCurrentProjectNotify(
                      {1, path("news").toStdWString(), path(QStringLiteral("速報")).toStdWString()});
                  QVERIFY(row(QStringLiteral("速報")).isValid());
@@ -303,12 +303,12 @@ void tst_windowdialogs_folder::noticesWhileHidden()
 void tst_windowdialogs_folder::renameOfTheFolderThatIsEdited()
 {
     request(path("news") + "/t2.xml");
-    QVERIFY(QDir(mFiles.titleRoot()).rename("news", "later"));
+    QVERIFY(QDir(m_files.titleRoot()).rename("news", "later"));
     EditTitlerController::getInstance()->updateFolderNameInCurrentProjectNotify(
         {1, path("news").toStdWString(), path("later").toStdWString()});
     QCOMPARE(list()->getCurrentPath(), path("later"));
     QCOMPARE(list()->count(), 2);
-    const auto* scene = mWindow->findChild<CanvasScene*>();
+    const auto* scene = m_window->findChild<CanvasScene*>();
     QCOMPARE(QString::fromStdString(scene->archive()->getPath()), path("later") + "/t2.xml");
     QCOMPARE(picker()->currentFolderName(), QStringLiteral("later"));
     QVERIFY(!QFileInfo::exists(path("news")));
@@ -326,19 +326,19 @@ void tst_windowdialogs_folder::renameUnderATextThatIsTyped()
 {
     QFETCH(QString, opened);
     request(path("news") + opened);
-    auto* scene = mWindow->findChild<CanvasScene*>();
+    auto* scene = m_window->findChild<CanvasScene*>();
     GraphicsText* item = scene->findTextItem(1);
     item->setTextInteractionFlags(Qt::TextEditorInteraction);
     item->textCursor().insertText(QStringLiteral("快讯"));
     QVERIFY(scene->itemIsEditorInteraction());
-    QVERIFY(QDir(mFiles.titleRoot()).rename("news", "later"));
+    QVERIFY(QDir(m_files.titleRoot()).rename("news", "later"));
     EditTitlerController::getInstance()->updateFolderNameInCurrentProjectNotify(
         {1, path("news").toStdWString(), path("later").toStdWString()});
     // What was typed is neither lost nor a step that would go back to the old folder.
     QCOMPARE(scene->findTextItem(1)->toPlainText(), QStringLiteral("t1快讯"));
-    for (QAction* action : mWindow->findChildren<QAction*>(QString(), Qt::FindDirectChildrenOnly))
+    for (QAction* action : m_window->findChildren<QAction*>(QString(), Qt::FindDirectChildrenOnly))
         QVERIFY(!action->text().startsWith("Undo") || !action->isEnabled());
-    mWindow->closeTitlerWindow();
+    m_window->closeTitlerWindow();
     Archive archive;
     QVERIFY(ArchiveController().getOneArchive(path("later") + "/t1.xml", &archive));
     QCOMPARE(QString::fromStdString(archive.text().front()->getText()), QStringLiteral("t1快讯"));
@@ -349,10 +349,10 @@ void tst_windowdialogs_folder::renameUnderATextThatIsTyped()
 
 void tst_windowdialogs_folder::noTemplateLeadsBackToThePicker()
 {
-    mFiles.makeFolder("empty");
-    auto* templates = mWindow->findChild<TemplatePicker*>();
+    m_files.makeFolder("empty");
+    auto* templates = m_window->findChild<TemplatePicker*>();
     bool shown = false;
-    mSiblings.forget();
+    m_siblings.forget();
     inDialog([this] { request(QString(), _titler_paramter::SUB_PANEL); },
              [&] {
                  choose("empty");
@@ -366,7 +366,7 @@ void tst_windowdialogs_folder::noTemplateLeadsBackToThePicker()
                  press("openFolderButton");
                  QVERIFY(picker()->isVisible());
                  QVERIFY(!isMasked(picker()));
-                 QVERIFY(isMasked(mWindow));
+                 QVERIFY(isMasked(m_window));
                  choose("news");
                  press("openFolderButton");
              });
@@ -398,7 +398,7 @@ void tst_windowdialogs_folder::masksLieOnTheDialog()
 
 void tst_windowdialogs_folder::languageAndFont()
 {
-    mWindow->slotSystemLanguageChanged(SystemSetupDef::emSystemLanguageChinese);
+    m_window->slotSystemLanguageChanged(SystemSetupDef::emSystemLanguageChinese);
     const auto* label = picker()->findChild<QLabel*>("folderPickerTitle");
     QCOMPARE(label->font().family(), QStringLiteral("DFHeiW5-A"));
     inDialog([this] { request(QString()); },
@@ -407,7 +407,7 @@ void tst_windowdialogs_folder::languageAndFont()
                           QStringLiteral("DFHeiW5-A"));
                  press("cancelFolderButton");
              });
-    mWindow->slotSystemLanguageChanged(SystemSetupDef::emSystemLanguageEnglish);
+    m_window->slotSystemLanguageChanged(SystemSetupDef::emSystemLanguageEnglish);
     QCOMPARE(label->font().family(), QStringLiteral("KST"));
 }
 

@@ -74,56 +74,56 @@ private:
     void request(const QString& folder);
     QWidget* opacityMask() const;
     QStringList userNames() const;
-    ArchiveList* list() const { return mWindow->findChild<ArchiveList*>(); }
-    TemplatePicker* picker() const { return mWindow->findChild<TemplatePicker*>(); }
+    ArchiveList* list() const { return m_window->findChild<ArchiveList*>(); }
+    TemplatePicker* picker() const { return m_window->findChild<TemplatePicker*>(); }
 
-    TemplateFixture mFixture;
-    Siblings mSiblings;
-    TitlerWindow* mWindow = nullptr;
-    int mOpened = 0;
-    int mFolders = 0;
-    QString mFolder;
+    TemplateFixture m_fixture;
+    Siblings m_siblings;
+    TitlerWindow* m_window = nullptr;
+    int m_opened = 0;
+    int m_folders = 0;
+    QString m_folder;
 };
 
 void tst_windowdialogs_template::initTestCase()
 {
-    QVERIFY(mSiblings.listenOnFreePorts());
-    mFixture.resetTemplates();
-    mFixture.makePresets("templates_en", {"lower", "strap"});
-    mFixture.makePresets("templates_chs", {"xia", "tiao", "jiao"});
-    mFixture.makeUserTemplates(2);
+    QVERIFY(m_siblings.listenOnFreePorts());
+    m_fixture.resetTemplates();
+    m_fixture.makePresets("templates_en", {"lower", "strap"});
+    m_fixture.makePresets("templates_chs", {"xia", "tiao", "jiao"});
+    m_fixture.makeUserTemplates(2);
     APPEventFilter::instance();
     Q_INIT_RESOURCE(UILibrary);
     Q_INIT_RESOURCE(TitlerToolResource);
-    mWindow = new TitlerWindow(true, nullptr);
-    pMainWindow = mWindow;
-    mWindow->setRealClose(false);
+    m_window = new TitlerWindow(true, nullptr);
+    pMainWindow = m_window;
+    m_window->setRealClose(false);
 }
 
 void tst_windowdialogs_template::cleanupTestCase()
 {
-    delete mWindow;
+    delete m_window;
     pMainWindow = nullptr;
     APPEventFilter::release();
 }
 
 void tst_windowdialogs_template::init()
 {
-    mOpened = 0;
-    mFolder = mFixture.makeFolder(QStringLiteral("folder%1").arg(++mFolders));
-    LibraryFixture::fillFolder(mFolder, {"t1", "t2"});
-    request(mFolder);
+    m_opened = 0;
+    m_folder = m_fixture.makeFolder(QStringLiteral("folder%1").arg(++m_folders));
+    LibraryFixture::fillFolder(m_folder, {"t1", "t2"});
+    request(m_folder);
 }
 
 void tst_windowdialogs_template::cleanup()
 {
-    mWindow->closeTitlerWindow();
-    QVERIFY(!mWindow->isVisible());
+    m_window->closeTitlerWindow();
+    QVERIFY(!m_window->isVisible());
 }
 
 void tst_windowdialogs_template::request(const QString& folder)
 {
-    mWindow->showTitlerWindow({_titler_paramter::CREATE_OR_EDIT, folder.toStdWString()});
+    m_window->showTitlerWindow({_titler_paramter::CREATE_OR_EDIT, folder.toStdWString()});
 }
 
 void tst_windowdialogs_template::whenOpen(std::function<void()> action)
@@ -131,7 +131,7 @@ void tst_windowdialogs_template::whenOpen(std::function<void()> action)
     QTimer::singleShot(0, this, [this, action] {
         if (!picker()->isVisible())
             return;
-        ++mOpened;
+        ++m_opened;
         action();
         picker()->reject();
     });
@@ -140,8 +140,8 @@ void tst_windowdialogs_template::whenOpen(std::function<void()> action)
 // The one dark child that is no mask for messages: those do not exist before their first use.
 QWidget* tst_windowdialogs_template::opacityMask() const
 {
-    for (QWidget* child : mWindow->findChildren<QWidget*>(QString(), Qt::FindDirectChildrenOnly))
-        if (child->size() == mWindow->size() && child->autoFillBackground() && !child->isWindow())
+    for (QWidget* child : m_window->findChildren<QWidget*>(QString(), Qt::FindDirectChildrenOnly))
+        if (child->size() == m_window->size() && child->autoFillBackground() && !child->isWindow())
             return child;
     return nullptr;
 }
@@ -157,7 +157,7 @@ QStringList tst_windowdialogs_template::userNames() const
 void tst_windowdialogs_template::opensModalOverADarkenedWindow()
 {
     UserEvents events;
-    mWindow->installEventFilter(&events);
+    m_window->installEventFilter(&events);
     QVERIFY(opacityMask());
     QVERIFY(!opacityMask()->isVisible());
     whenOpen([this, &events] {
@@ -166,37 +166,37 @@ void tst_windowdialogs_template::opensModalOverADarkenedWindow()
         QCOMPARE(opacityMask()->palette().color(QPalette::Window), QColor(0, 0, 0, 166));
         QCOMPARE(events.types, QList<int>{1150});
     });
-    mWindow->showTemplateDialog();
-    QCOMPARE(mOpened, 1);
+    m_window->showTemplateDialog();
+    QCOMPARE(m_opened, 1);
     QVERIFY(!opacityMask()->isVisible());
     QCOMPARE(events.types, (QList<int>{1150, 1151}));
     events.types.clear();
     whenOpen([] {});
-    mWindow->showTemplateDialog();
+    m_window->showTemplateDialog();
     QCOMPARE(events.types, (QList<int>{1150, 1151}));
 }
 
 void tst_windowdialogs_template::aSecondRequestChangesNothing()
 {
     whenOpen([this] {
-        mWindow->showTemplateDialog();
+        m_window->showTemplateDialog();
         QVERIFY(picker()->isVisible());
         QVERIFY(opacityMask()->isVisible());
     });
-    mWindow->showTemplateDialog();
-    QCOMPARE(mOpened, 1);
+    m_window->showTemplateDialog();
+    QCOMPARE(m_opened, 1);
 }
 
 void tst_windowdialogs_template::openingBreaksTouchLocks()
 {
     APPEventFilter* filter = APPEventFilter::instance();
-    KSPushbutton* move = mWindow->findChild<KSPushbutton*>();
+    KSPushbutton* move = m_window->findChild<KSPushbutton*>();
     QVERIFY(move);
     QCOMPARE(filter->tryLock(move, LOCKMETHOD_TOUCH), 0);
     QVERIFY(filter->isLock(move, LOCKMETHOD_TOUCH));
     whenOpen([filter, move] { QVERIFY(!filter->isLock(move, LOCKMETHOD_TOUCH)); });
-    mWindow->showTemplateDialog();
-    QCOMPARE(mOpened, 1);
+    m_window->showTemplateDialog();
+    QCOMPARE(m_opened, 1);
 }
 
 void tst_windowdialogs_template::cancelMakesNoTitle()
@@ -208,10 +208,10 @@ void tst_windowdialogs_template::cancelMakesNoTitle()
         QVERIFY(!picker()->isVisible());
     });
     Q_EMIT list()->startTemplatePicker();
-    QCOMPARE(mOpened, 1);
+    QCOMPARE(m_opened, 1);
     QVERIFY(!picker()->isSelectedItem());
     QCOMPARE(list()->count(), 2);
-    QCOMPARE(LibraryFixture::order(mFolder), QStringList({"t1", "t2"}));
+    QCOMPARE(LibraryFixture::order(m_folder), QStringList({"t1", "t2"}));
 }
 
 void tst_windowdialogs_template::theChosenTemplateBecomesATitle()
@@ -222,25 +222,25 @@ void tst_windowdialogs_template::theChosenTemplateBecomesATitle()
         QTest::mouseClick(picker()->findChild<KSPushbutton*>("selectPresetButton"), Qt::LeftButton);
     });
     Q_EMIT list()->startTemplatePicker();
-    QCOMPARE(mOpened, 1);
+    QCOMPARE(m_opened, 1);
     QVERIFY(picker()->isSelectedItem());
     QCOMPARE(list()->count(), 3);
     const Archive* made = list()->getSelectedArchive()->getArchiveData();
     QCOMPARE(QString::fromStdString(made->getText().front()->getText()), QString("strap"));
-    auto* scene = mWindow->findChild<CanvasScene*>();
+    auto* scene = m_window->findChild<CanvasScene*>();
     QCOMPARE(scene->archive()->getPath(), made->getPath());
-    QTRY_COMPARE(LibraryFixture::order(mFolder).size(), 3);
+    QTRY_COMPARE(LibraryFixture::order(m_folder).size(), 3);
 }
 
 void tst_windowdialogs_template::anEmptyFolderAsksForATemplate()
 {
-    mWindow->closeTitlerWindow();
-    const QString empty = mFixture.makeFolder(QStringLiteral("empty%1").arg(mFolders));
+    m_window->closeTitlerWindow();
+    const QString empty = m_fixture.makeFolder(QStringLiteral("empty%1").arg(m_folders));
     whenOpen([this] { QVERIFY(list()->isEmpty()); });
     request(empty);
-    QCOMPARE(mOpened, 1);
-    QVERIFY(mWindow->isVisible());
-    QVERIFY(!mWindow->findChild<CanvasScene*>()->archive());
+    QCOMPARE(m_opened, 1);
+    QVERIFY(m_window->isVisible());
+    QVERIFY(!m_window->findChild<CanvasScene*>()->archive());
 }
 
 void tst_windowdialogs_template::beginsWithTheOperatorsTemplates()
@@ -249,7 +249,7 @@ void tst_windowdialogs_template::beginsWithTheOperatorsTemplates()
     tabs->setCurrentIndex(0);
     whenOpen([tabs] { QCOMPARE(tabs->currentIndex(), 1); });
     Q_EMIT list()->startUserTemplatePicker();
-    QCOMPARE(mOpened, 1);
+    QCOMPARE(m_opened, 1);
 }
 
 void tst_windowdialogs_template::presetsFollowTheSystemLanguage()
@@ -260,7 +260,7 @@ void tst_windowdialogs_template::presetsFollowTheSystemLanguage()
     setup->setSystemLanguageNotify(SystemSetupDef::emSystemLanguageEnglish);
     QCOMPARE(picker()->presetTab()->count(), 2);
     // The same language again reads nothing: what was added on disk does not show.
-    mFixture.makePresets("templates_en", {"lower", "strap", "quote"});
+    m_fixture.makePresets("templates_en", {"lower", "strap", "quote"});
     setup->setSystemLanguageNotify(SystemSetupDef::emSystemLanguageEnglish);
     QCOMPARE(picker()->presetTab()->count(), 2);
 }
@@ -270,7 +270,7 @@ void tst_windowdialogs_template::noticesOfTheFileManager()
     auto* fileManager = EditTitlerController::getInstance();
     QCOMPARE(userNames(), QStringList({"UserTemplate_001", "UserTemplate_002"}));
 
-    mFixture.makeUserPictures("Imported 导入");
+    m_fixture.makeUserPictures("Imported 导入");
     FileManagerDefine::tagImportNotify import;
     import.fileType = FileManagerDefine::FILE_TYPE_TITLER_TEMPLATE;
     import.path = L"Imported 导入";
@@ -281,38 +281,38 @@ void tst_windowdialogs_template::noticesOfTheFileManager()
     fileManager->importNotify(import);
     QCOMPARE(userNames().size(), 3);
 
-    QVERIFY(QDir(mFixture.userRoot()).rename("UserTemplate_001", "Renamed"));
+    QVERIFY(QDir(m_fixture.userRoot()).rename("UserTemplate_001", "Renamed"));
     FileManagerDefine::tagRenameNotify rename;
     rename.fileType = FileManagerDefine::FILE_TYPE_TITLER_TEMPLATE;
     rename.strings[0] = L"UserTemplate_001";
     rename.strings[2] = L"Renamed";
-    rename.strings[3] = (mFixture.userRoot() + "/Renamed/").toStdWString();
+    rename.strings[3] = (m_fixture.userRoot() + "/Renamed/").toStdWString();
     fileManager->renameTitlerTemplateNotify(rename);
     QCOMPARE(userNames(), QStringList({"Renamed", "UserTemplate_002", "Imported 导入"}));
     QCOMPARE(QString::fromStdString(picker()->userTab()->archive(0)->getPath()),
-             mFixture.userTitle("Renamed"));
-    QCOMPARE(mFixture.userOrder(), userNames());
+             m_fixture.userTitle("Renamed"));
+    QCOMPARE(m_fixture.userOrder(), userNames());
 
     FileManagerDefine::tagDeleteNotify gone;
     gone.fileType = FileManagerDefine::FILE_TYPE_TITLER_TEMPLATE;
     gone.result = 1; // refused there
-    gone.path = mFixture.userTitle("UserTemplate_002").toStdWString();
+    gone.path = m_fixture.userTitle("UserTemplate_002").toStdWString();
     fileManager->deleteNotify(gone);
     QCOMPARE(userNames().size(), 3);
     gone.result = 0;
-    QVERIFY(QDir(mFixture.userRoot() + "/UserTemplate_002").removeRecursively());
+    QVERIFY(QDir(m_fixture.userRoot() + "/UserTemplate_002").removeRecursively());
     fileManager->deleteNotify(gone);
     QCOMPARE(userNames(), QStringList({"Renamed", "Imported 导入"}));
 }
 
 void tst_windowdialogs_template::aSavedTitleJoinsTheTemplates()
 {
-    mFixture.makeUserTemplate("UserTemplate_009", {"saved text"});
+    m_fixture.makeUserTemplate("UserTemplate_009", {"saved text"});
     const qsizetype before = userNames().size();
     Q_EMIT list()->addUserSignal("UserTemplate_009");
     QCOMPARE(userNames().size(), before + 1);
     QCOMPARE(userNames().last(), QString("UserTemplate_009"));
-    QCOMPARE(mFixture.userOrder().last(), QString("UserTemplate_009"));
+    QCOMPARE(m_fixture.userOrder().last(), QString("UserTemplate_009"));
 }
 
 void tst_windowdialogs_template::masksGoOverTheOpenDialogOnly()
@@ -340,19 +340,19 @@ void tst_windowdialogs_template::masksGoOverTheOpenDialogOnly()
         QCOMPARE(shownMasks(), 0);
         QVERIFY(picker()->testAttribute(Qt::WA_AcceptTouchEvents));
     });
-    mWindow->showTemplateDialog();
-    QCOMPARE(mOpened, 1);
+    m_window->showTemplateDialog();
+    QCOMPARE(m_opened, 1);
 }
 
 void tst_windowdialogs_template::theEndOfTheSessionClosesIt()
 {
     whenOpen([this] {
-        mWindow->continueCloseTitler({1, MessageDefine::CLOSE_OK, MessageDef::MESSAGE_CONFIRM_CLOSE});
+        m_window->continueCloseTitler({1, MessageDefine::CLOSE_OK, MessageDef::MESSAGE_CONFIRM_CLOSE});
         QVERIFY(!picker()->isVisible());
     });
-    mWindow->showTemplateDialog();
-    QCOMPARE(mOpened, 1);
-    QVERIFY(!mWindow->isVisible());
+    m_window->showTemplateDialog();
+    QCOMPARE(m_opened, 1);
+    QVERIFY(!m_window->isVisible());
     QVERIFY(list()->isEmpty());
 }
 

@@ -24,28 +24,28 @@ private Q_SLOTS:
     void listKeepsItsPlace();
 
 private:
-    QTemporaryDir mPrefix;
-    Siblings mSiblings;
-    std::unique_ptr<TitlerWindow> mWindow;
+    QTemporaryDir m_prefix;
+    Siblings m_siblings;
+    std::unique_ptr<TitlerWindow> m_window;
 };
 
 void tst_windowlanguage::initTestCase()
 {
-    QVERIFY(mSiblings.listenOnFreePorts());
-    const QString folder = mPrefix.filePath("share/kestrel/translations/titler");
+    QVERIFY(m_siblings.listenOnFreePorts());
+    const QString folder = m_prefix.filePath("share/kestrel/translations/titler");
     QVERIFY(QDir().mkpath(folder));
     QVERIFY(QFile::copy(QStringLiteral(TITLER_TRANSLATION_DIR "/cn.qm"), folder + "/cn.qm"));
-    qputenv("K2SYS_AC_PREFIX", mPrefix.path().toUtf8());
+    qputenv("K2SYS_AC_PREFIX", m_prefix.path().toUtf8());
     Q_INIT_RESOURCE(UILibrary);
     Q_INIT_RESOURCE(TitlerToolResource);
     APPEventFilter::instance();
-    mWindow = std::make_unique<TitlerWindow>(true, nullptr);
-    pMainWindow = mWindow.get();
+    m_window = std::make_unique<TitlerWindow>(true, nullptr);
+    pMainWindow = m_window.get();
 }
 
 void tst_windowlanguage::cleanupTestCase()
 {
-    mWindow.reset();
+    m_window.reset();
     pMainWindow = nullptr;
     APPEventFilter::release();
 }
@@ -53,33 +53,33 @@ void tst_windowlanguage::cleanupTestCase()
 void tst_windowlanguage::missingTranslationLeavesTheLanguage()
 {
     const auto shows = [this](const QString& text) {
-        const QList<KSPushbutton*> buttons = mWindow->findChildren<KSPushbutton*>();
+        const QList<KSPushbutton*> buttons = m_window->findChildren<KSPushbutton*>();
         return std::any_of(buttons.cbegin(), buttons.cend(),
                            [&text](const KSPushbutton* b) { return b->text() == text; });
     };
     QVERIFY(shows("Move"));
-    mWindow->slotSystemLanguageChanged(SystemSetupDef::emSystemLanguageChinese);
+    m_window->slotSystemLanguageChanged(SystemSetupDef::emSystemLanguageChinese);
     QVERIFY(shows("移动"));
-    mWindow->slotSystemLanguageChanged(SystemSetupDef::emSystemLanguageEnglish);
+    m_window->slotSystemLanguageChanged(SystemSetupDef::emSystemLanguageEnglish);
     QVERIFY(shows("移动"));
     // What is translated later, too.
-    mWindow->editAndDoneButtonClicked();
+    m_window->editAndDoneButtonClicked();
     QVERIFY(shows("完成"));
-    mWindow->editAndDoneButtonClicked();
+    m_window->editAndDoneButtonClicked();
     QVERIFY(shows("移动"));
 }
 
 // Its frame is painted at a fixed place of the window.
 void tst_windowlanguage::listKeepsItsPlace()
 {
-    mWindow->show();
-    QVERIFY(QTest::qWaitForWindowExposed(mWindow.get(), PATIENCE_MS));
-    const auto* list = mWindow->findChild<ArchiveList*>();
+    m_window->show();
+    QVERIFY(QTest::qWaitForWindowExposed(m_window.get(), PATIENCE_MS));
+    const auto* list = m_window->findChild<ArchiveList*>();
     for (const auto language :
          {SystemSetupDef::emSystemLanguageEnglish, SystemSetupDef::emSystemLanguageChinese}) {
-        mWindow->slotSystemLanguageChanged(language);
+        m_window->slotSystemLanguageChanged(language);
         QCoreApplication::processEvents();
-        QCOMPARE(QRect(list->mapTo(mWindow.get(), QPoint(0, 0)), list->size()), QRect(14, 64, 549, 997));
+        QCOMPARE(QRect(list->mapTo(m_window.get(), QPoint(0, 0)), list->size()), QRect(14, 64, 549, 997));
     }
 }
 

@@ -9,20 +9,20 @@ class FileSizeLimit
 public:
     explicit FileSizeLimit(rlim_t bytes)
     {
-        mSignal = std::signal(SIGXFSZ, SIG_IGN);
-        ::getrlimit(RLIMIT_FSIZE, &mBefore);
-        const rlimit limit{bytes, mBefore.rlim_max};
+        m_signal = std::signal(SIGXFSZ, SIG_IGN);
+        ::getrlimit(RLIMIT_FSIZE, &m_before);
+        const rlimit limit{bytes, m_before.rlim_max};
         ::setrlimit(RLIMIT_FSIZE, &limit);
     }
     FileSizeLimit(const FileSizeLimit&) = delete;
     FileSizeLimit& operator=(const FileSizeLimit&) = delete;
     ~FileSizeLimit()
     {
-        ::setrlimit(RLIMIT_FSIZE, &mBefore);
-        std::signal(SIGXFSZ, mSignal);
+        ::setrlimit(RLIMIT_FSIZE, &m_before);
+        std::signal(SIGXFSZ, m_signal);
     }
 
 private:
-    rlimit mBefore = {};
-    void (*mSignal)(int) = nullptr;
+    rlimit m_before = {};
+    void (*m_signal)(int) = nullptr;
 };

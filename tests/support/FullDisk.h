@@ -11,14 +11,14 @@ public:
     FullDisk()
     {
         ::signal(SIGXFSZ, SIG_IGN);
-        ::getrlimit(RLIMIT_FSIZE, &mLimit);
-        const rlimit full = {0, mLimit.rlim_max};
+        ::getrlimit(RLIMIT_FSIZE, &m_limit);
+        const rlimit full = {0, m_limit.rlim_max};
         ::setrlimit(RLIMIT_FSIZE, &full);
     }
-    ~FullDisk() { ::setrlimit(RLIMIT_FSIZE, &mLimit); }
+    ~FullDisk() { ::setrlimit(RLIMIT_FSIZE, &m_limit); }
     FullDisk(const FullDisk&) = delete;
     FullDisk& operator=(const FullDisk&) = delete;
 
 private:
-    rlimit mLimit = {};
+    rlimit m_limit = {};
 };

@@ -13,7 +13,7 @@ class LogFixture
 public:
     LogFixture()
     {
-        qputenv("K2SYS_LOG_DIR", mDir.path().toLocal8Bit());
+        qputenv("K2SYS_LOG_DIR", m_dir.path().toLocal8Bit());
         UNINIT_LOGGING(); // the input context of an application has started the log in another folder
         INIT_LOGGING(L"test");
     }
@@ -24,17 +24,17 @@ public:
     // Without one as "[area] number: text".
     QStringList takeOperations(const QString& area = {})
     {
-        return take(QStringLiteral("k2_ope.log"), mOperationsEnd, area);
+        return take(QStringLiteral("k2_ope.log"), m_operationsEnd, area);
     }
     QStringList takeDebugLines(const QString& area = {})
     {
-        return take(QStringLiteral("k2_ope_debug.log"), mDebugEnd, area);
+        return take(QStringLiteral("k2_ope_debug.log"), m_debugEnd, area);
     }
 
 private:
     QStringList take(const QString& name, qint64& end, const QString& area) const
     {
-        QFile file(mDir.filePath(name));
+        QFile file(m_dir.filePath(name));
         if (!file.open(QIODevice::ReadOnly) || !file.seek(end))
             return {QStringLiteral("no ") + name};
         const QStringList lines =
@@ -52,7 +52,7 @@ private:
         return result;
     }
 
-    QTemporaryDir mDir;
-    qint64 mOperationsEnd = 0;
-    qint64 mDebugEnd = 0;
+    QTemporaryDir m_dir;
+    qint64 m_operationsEnd = 0;
+    qint64 m_debugEnd = 0;
 };

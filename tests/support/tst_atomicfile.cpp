@@ -31,12 +31,12 @@ class tst_atomicfile : public QObject
     Q_OBJECT
 
 private Q_SLOTS:
-    void init() { mFolder = std::make_unique<QTemporaryDir>(); }
+    void init() { m_folder = std::make_unique<QTemporaryDir>(); }
 
     void cleanup()
     {
         QVERIFY(FileSyncQueue::flush(30s));
-        mFolder.reset();
+        m_folder.reset();
     }
 
     void writesAndReplaces_data()
@@ -66,11 +66,11 @@ private Q_SLOTS:
     {
         QVERIFY(!AtomicFile::write("", "x"));
         QVERIFY(!AtomicFile::write(path("no/such/folder.xml"), "x"));
-        QVERIFY(!AtomicFile::write(mFolder->path().toStdString(), "x"));
+        QVERIFY(!AtomicFile::write(m_folder->path().toStdString(), "x"));
         QVERIFY(!AtomicFile::write("/dev/full", "x"));
         QVERIFY(AtomicFile::write("/dev/null", "x"));
         QVERIFY(!AtomicFile::copy(path("missing"), path("copy")));
-        QVERIFY(!AtomicFile::copy(mFolder->path().toStdString(), path("copy")));
+        QVERIFY(!AtomicFile::copy(m_folder->path().toStdString(), path("copy")));
         QVERIFY(entries().isEmpty());
     }
 
@@ -201,11 +201,11 @@ private Q_SLOTS:
         for (const char* name :
              {".titler-new-1-1-0", ".titler-new-99999999-5-0", ".titler-new-", ".titler-new-x-y-z"})
             QVERIFY(AtomicFile::write(path(name), "half"));
-        const std::string inUse = HiddenName::temporary(mFolder->path().toStdString());
+        const std::string inUse = HiddenName::temporary(m_folder->path().toStdString());
         QVERIFY(AtomicFile::write(inUse, "half"));
         QVERIFY(AtomicFile::write(path("title.xml"), GOOD_XML));
         QVERIFY(FileSyncQueue::flush(30s));
-        LeftoverSweep::sweep(mFolder->path().toStdString());
+        LeftoverSweep::sweep(m_folder->path().toStdString());
         QCOMPARE(entries(), QStringList({QString::fromStdString(inUse).section('/', -1), "title.xml"}));
     }
 
@@ -240,7 +240,7 @@ private Q_SLOTS:
         QFETCH(QByteArray, expected);
         put(path(name), now);
         put(HiddenName::kept(path(name)), kept);
-        LeftoverSweep::sweep(mFolder->path().toStdString() + '/');
+        LeftoverSweep::sweep(m_folder->path().toStdString() + '/');
         QVERIFY(FileSyncQueue::flush(30s));
         QCOMPARE(read(path(name)), expected);
         QCOMPARE(entries(), QStringList{name});
@@ -249,23 +249,23 @@ private Q_SLOTS:
     void sweepDoesNotBringDeletedFilesBack()
     {
         put(HiddenName::kept(path("gone.xml")), QByteArray::fromStdString(GOOD_XML));
-        LeftoverSweep::sweep(mFolder->path().toStdString());
+        LeftoverSweep::sweep(m_folder->path().toStdString());
         QVERIFY(FileSyncQueue::flush(30s));
         QVERIFY(entries().isEmpty());
     }
 
     void sweepLooksIntoTheFoldersBelow()
     {
-        QVERIFY(QDir(mFolder->path()).mkdir("新闻"));
+        QVERIFY(QDir(m_folder->path()).mkdir("新闻"));
         put(path("新闻/.titler-new-99999999-5-0"), "half");
         put(HiddenName::kept(path("新闻/a.xml")), QByteArray::fromStdString(GOOD_XML));
         put(path("新闻/a.xml"), "<manif");
-        LeftoverSweep::sweepWithChildren(mFolder->path().toStdString());
+        LeftoverSweep::sweepWithChildren(m_folder->path().toStdString());
         QVERIFY(FileSyncQueue::flush(30s));
         QCOMPARE(read(path("新闻/a.xml")).toStdString(), GOOD_XML);
-        QCOMPARE(
-            QDir(mFolder->filePath("新闻")).entryList(QDir::AllEntries | QDir::Hidden | QDir::NoDotAndDotDot),
-            QStringList{"a.xml"});
+        QCOMPARE(QDir(m_folder->filePath("新闻"))
+                     .entryList(QDir::AllEntries | QDir::Hidden | QDir::NoDotAndDotDot),
+                 QStringList{"a.xml"});
     }
 
     // As after a cut power: what was on the disk stays at hand until what replaced it is there, too.
@@ -274,7 +274,7 @@ private Q_SLOTS:
         const std::string file = path("title.xml");
         put(file, QByteArray::fromStdString(GOOD_XML));
         const std::string kept = HiddenName::kept(file);
-        const std::string temporary = HiddenName::temporary(mFolder->path().toStdString());
+        const std::string temporary = HiddenName::temporary(m_folder->path().toStdString());
         put(temporary, "<manifest/>");
         QVERIFY(FileSyncQueue::publish(temporary, file));
         QCOMPARE(read(file), QByteArray("<manifest/>"));
@@ -301,11 +301,11 @@ private Q_SLOTS:
     }
 
 private:
-    std::string path(const QString& name) const { return mFolder->filePath(name).toStdString(); }
+    std::string path(const QString& name) const { return m_folder->filePath(name).toStdString(); }
 
     QStringList entries() const
     {
-        return QDir(mFolder->path())
+        return QDir(m_folder->path())
             .entryList(QDir::AllEntries | QDir::Hidden | QDir::System | QDir::NoDotAndDotDot);
     }
 
@@ -333,7 +333,7 @@ private:
         return bytes;
     }
 
-    std::unique_ptr<QTemporaryDir> mFolder;
+    std::unique_ptr<QTemporaryDir> m_folder;
 };
 
 QTEST_GUILESS_MAIN(tst_atomicfile)

@@ -19,9 +19,9 @@ class tst_confinedpath : public QObject
 private Q_SLOTS:
     void initTestCase()
     {
-        QVERIFY(QDir(mRoot.path()).mkpath("defaultuser/titles/news"));
-        QVERIFY(QDir(mRoot.path()).mkpath("defaultuser/titles2"));
-        QVERIFY(QDir(mRoot.path()).mkpath("outside"));
+        QVERIFY(QDir(m_root.path()).mkpath("defaultuser/titles/news"));
+        QVERIFY(QDir(m_root.path()).mkpath("defaultuser/titles2"));
+        QVERIFY(QDir(m_root.path()).mkpath("outside"));
         put("defaultuser/PathInfo.xml", "<p><TitleResource path=\"titles\"/></p>");
         put("defaultuser/titles/news/a.xml", "a");
         put("outside/b.xml", "b");
@@ -31,7 +31,7 @@ private Q_SLOTS:
         link("defaultuser/titles/loop", "defaultuser/titles/loop");
         link("defaultuser/titles/news", "defaultuser/titles/inside");
         link("defaultuser/titles", "root");
-        qputenv("K2SYS_AC_DATA", mRoot.path().toUtf8());
+        qputenv("K2SYS_AC_DATA", m_root.path().toUtf8());
     }
 
     void init()
@@ -108,7 +108,7 @@ private Q_SLOTS:
     {
         const QString before = QDir::currentPath();
         QVERIFY(QDir::setCurrent("/"));
-        const std::string root = mRoot.path().toStdString().substr(1);
+        const std::string root = m_root.path().toStdString().substr(1);
         QVERIFY(ConfinedPath::isBelow(root + "/defaultuser/titles", root + "/defaultuser/titles/news"));
         QVERIFY(ConfinedPath::isBelow(root + "/defaultuser/titles", told("%1/defaultuser/titles/news")));
         QVERIFY(!ConfinedPath::isBelow(root + "/defaultuser/titles", root + "/outside"));
@@ -157,21 +157,21 @@ private Q_SLOTS:
     }
 
 private:
-    std::string told(QString path) const { return path.replace("%1", mRoot.path()).toStdString(); }
+    std::string told(QString path) const { return path.replace("%1", m_root.path()).toStdString(); }
 
     void put(const QString& name, const QByteArray& bytes) const
     {
-        QFile file(mRoot.filePath(name));
+        QFile file(m_root.filePath(name));
         QVERIFY(file.open(QIODevice::WriteOnly));
         file.write(bytes);
     }
 
     void link(const QString& target, const QString& name) const
     {
-        QVERIFY(QFile::link(mRoot.filePath(target), mRoot.filePath(name)));
+        QVERIFY(QFile::link(m_root.filePath(target), m_root.filePath(name)));
     }
 
-    QTemporaryDir mRoot;
+    QTemporaryDir m_root;
 };
 
 QTEST_GUILESS_MAIN(tst_confinedpath)

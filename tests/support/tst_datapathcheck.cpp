@@ -31,18 +31,18 @@ private:
         return QString::fromStdString(DataPathCheck::problem());
     }
 
-    QTemporaryDir mFolder{"/tmp/dpcXXXXXX"};
+    QTemporaryDir m_folder{"/tmp/dpcXXXXXX"};
 };
 
 void tst_datapathcheck::init()
 {
     qunsetenv("K2SYS_AC_ROOT");
-    QVERIFY(mFolder.isValid());
+    QVERIFY(m_folder.isValid());
 }
 
 void tst_datapathcheck::goodPaths()
 {
-    const QByteArray path = mFolder.path().toUtf8();
+    const QByteArray path = m_folder.path().toUtf8();
     QCOMPARE(problemOf(path), QString());
     QVERIFY(QDir(path + "/defaultuser").exists());
     QCOMPARE(QDir(path + "/defaultuser").entryList(QDir::AllEntries | QDir::Hidden | QDir::NoDotAndDotDot),
@@ -66,7 +66,7 @@ void tst_datapathcheck::longPaths_data()
 void tst_datapathcheck::longPaths()
 {
     QFETCH(int, length);
-    const QByteArray path = mFolder.path().toUtf8() + '/';
+    const QByteArray path = m_folder.path().toUtf8() + '/';
     QVERIFY(problemOf(path + QByteArray(length - path.size(), 'x')).contains("too long"));
     QVERIFY(QDir(path).entryList(QDir::AllEntries | QDir::NoDotAndDotDot).filter("xx").size() <= 1);
 }
@@ -88,7 +88,7 @@ void tst_datapathcheck::relativePaths()
 
 void tst_datapathcheck::aFileInTheWay()
 {
-    QFile file(mFolder.filePath("file"));
+    QFile file(m_folder.filePath("file"));
     QVERIFY(file.open(QIODevice::WriteOnly));
     const QString problem = problemOf(file.fileName().toUtf8() + "/data");
     QVERIFY2(problem.contains("cannot be written: Not a directory"), qPrintable(problem));
@@ -105,10 +105,10 @@ void tst_datapathcheck::noFileCanBeMade()
 {
     if (geteuid() == 0)
         QSKIP("root may write everywhere");
-    const QString user = mFolder.filePath("closed/defaultuser");
+    const QString user = m_folder.filePath("closed/defaultuser");
     QVERIFY(QDir().mkpath(user));
     QVERIFY(QFile::setPermissions(user, QFile::ReadOwner | QFile::ExeOwner));
-    const QString problem = problemOf(mFolder.filePath("closed").toUtf8());
+    const QString problem = problemOf(m_folder.filePath("closed").toUtf8());
     QVERIFY2(problem.contains("Permission denied"), qPrintable(problem));
 }
 

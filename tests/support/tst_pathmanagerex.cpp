@@ -21,11 +21,11 @@ class tst_pathmanagerex : public QObject
 private Q_SLOTS:
     void init()
     {
-        mFolder = std::make_unique<QTemporaryDir>();
-        QVERIFY(mFolder->path().size() < 90);
-        qputenv("K2SYS_AC_DATA", mFolder->path().toUtf8());
+        m_folder = std::make_unique<QTemporaryDir>();
+        QVERIFY(m_folder->path().size() < 90);
+        qputenv("K2SYS_AC_DATA", m_folder->path().toUtf8());
         qputenv("K2SYS_AC_ROOT", "");
-        QVERIFY(QDir(mFolder->path()).mkdir("defaultuser"));
+        QVERIFY(QDir(m_folder->path()).mkdir("defaultuser"));
     }
 
     void cleanup()
@@ -123,7 +123,7 @@ private Q_SLOTS:
     void newFoldersHaveUniqueNames()
     {
         PathManagerEx paths;
-        const QString parent = mFolder->path();
+        const QString parent = m_folder->path();
         const QString one = QString::fromStdWString(paths.CreateNewFolder(parent.toStdWString()));
         const QString two = QString::fromStdWString(paths.CreateNewFolder((parent + "/").toStdWString()));
         const QRegularExpression form("^" + QRegularExpression::escape(parent) + "/[0-9A-F]{32}$");
@@ -135,7 +135,7 @@ private Q_SLOTS:
 
     void loaderMovesItsCursor()
     {
-        const std::string file = mFolder->filePath("x.xml").toStdString();
+        const std::string file = m_folder->filePath("x.xml").toStdString();
         put(file, "<root><a n=\"1\"><b n=\"2\">text</b></a><b n=\"3\"/><c n=\"4\"/></root>");
         XMLLoader loader;
         QVERIFY(!loader.selectRootNode());
@@ -170,7 +170,7 @@ private Q_SLOTS:
 
     void environmentPaths()
     {
-        QCOMPARE(QString::fromStdWString(SystemInfo::getDataPath()), mFolder->path());
+        QCOMPARE(QString::fromStdWString(SystemInfo::getDataPath()), m_folder->path());
         qputenv("K2SYS_AC_PREFIX", "/opt/标题");
         QCOMPARE(QString::fromStdWString(SystemInfo::getInstance()->getPrefixPath()), QString("/opt/标题"));
         qputenv("K2SYS_AC_PREFIX", QByteArray("/") + QByteArray(150, 'x'));
@@ -190,7 +190,7 @@ private Q_SLOTS:
 
     void diskSizesAreInKilobytesOfAThousand()
     {
-        const std::wstring folder = mFolder->path().toStdWString();
+        const std::wstring folder = m_folder->path().toStdWString();
         qputenv("K2SYS_FS_REMAIN", "200000999");
         QCOMPARE(SystemInfo::getDiskRemainSize(folder), 200000LL);
         qputenv("K2SYS_FS_REMAIN", "199999999");
@@ -200,16 +200,16 @@ private Q_SLOTS:
         QCOMPARE(SystemInfo::getDiskSize(folder + L"/missing"), -1LL);
 
         QCOMPARE(SystemInfo::getFolderSize(folder + L"/missing"), 0LL);
-        put(mFolder->filePath("a").toStdString(), QByteArray(2500, 'x'));
-        QVERIFY(QDir(mFolder->path()).mkpath("below/文件夹"));
-        put(mFolder->filePath("below/文件夹/b").toStdString(), QByteArray(1500, 'x'));
-        put(mFolder->filePath(".titler-new-1-1-1").toStdString(), QByteArray(9000, 'x'));
+        put(m_folder->filePath("a").toStdString(), QByteArray(2500, 'x'));
+        QVERIFY(QDir(m_folder->path()).mkpath("below/文件夹"));
+        put(m_folder->filePath("below/文件夹/b").toStdString(), QByteArray(1500, 'x'));
+        put(m_folder->filePath(".titler-new-1-1-1").toStdString(), QByteArray(9000, 'x'));
         QCOMPARE(SystemInfo::getFolderSize(folder), 4LL);
     }
 
     void copiesFilesAndFolders()
     {
-        const QString from = mFolder->filePath("从"), to = mFolder->filePath("到");
+        const QString from = m_folder->filePath("从"), to = m_folder->filePath("到");
         QVERIFY(SystemInfo::createFolders((from + "/sub/deep").toStdWString()));
         QVERIFY(!SystemInfo::createFolders((from + "/sub/deep").toStdWString()));
         put((from + "/a.xml").toStdString(), "new");
@@ -280,7 +280,7 @@ private:
         return all;
     }
 
-    QString base() const { return mFolder->path() + "/defaultuser/"; }
+    QString base() const { return m_folder->path() + "/defaultuser/"; }
 
     void writePathFile(const QByteArray& bytes) { put((base() + "PathInfo.xml").toStdString(), bytes); }
 
@@ -297,7 +297,7 @@ private:
         return in.open(QIODevice::ReadOnly) ? in.readAll() : QByteArray();
     }
 
-    std::unique_ptr<QTemporaryDir> mFolder;
+    std::unique_ptr<QTemporaryDir> m_folder;
 };
 
 QTEST_GUILESS_MAIN(tst_pathmanagerex)

@@ -43,9 +43,9 @@ class tst_refusedwrites : public QObject
 private Q_SLOTS:
     void init()
     {
-        mFolder = std::make_unique<QTemporaryDir>();
-        mCalls = 0;
-        RefusedWrites::setListener([this] { ++mCalls; });
+        m_folder = std::make_unique<QTemporaryDir>();
+        m_calls = 0;
+        RefusedWrites::setListener([this] { ++m_calls; });
     }
     void cleanup()
     {
@@ -65,7 +65,7 @@ private Q_SLOTS:
             QVERIFY(!AtomicFile::write(file, "<new/>"));
             QCOMPARE(errno, EFBIG);
             RefusedWrites::keep(path("./title.xml"), "<new/>", EFBIG);
-            QCOMPARE(mCalls.load(), 1);
+            QCOMPARE(m_calls.load(), 1);
             QVERIFY(RefusedWrites::retry().empty());
         }
         QCOMPARE(read("title.xml"), QByteArray("<old/>"));
@@ -203,8 +203,8 @@ private Q_SLOTS:
     }
 
 private:
-    QString name(const QString& file) const { return mFolder->filePath(file); }
-    std::string path(const std::string& file) const { return (mFolder->path().toStdString() + '/') + file; }
+    QString name(const QString& file) const { return m_folder->filePath(file); }
+    std::string path(const std::string& file) const { return (m_folder->path().toStdString() + '/') + file; }
     QByteArray read(const QString& file) const
     {
         QFile opened(name(file));
@@ -212,7 +212,7 @@ private:
     }
     QStringList files() const
     {
-        return QDir(mFolder->path()).entryList(QDir::Files | QDir::Hidden, QDir::Name);
+        return QDir(m_folder->path()).entryList(QDir::Files | QDir::Hidden, QDir::Name);
     }
     static std::string rootOf(const std::string& file)
     {
@@ -221,8 +221,8 @@ private:
                                                                        : std::string();
     }
 
-    std::unique_ptr<QTemporaryDir> mFolder;
-    std::atomic<int> mCalls = 0;
+    std::unique_ptr<QTemporaryDir> m_folder;
+    std::atomic<int> m_calls = 0;
 };
 
 QTEST_GUILESS_MAIN(tst_refusedwrites)

@@ -70,7 +70,7 @@ class tst_xmlfile : public QObject
     Q_OBJECT
 
 private Q_SLOTS:
-    void initTestCase() { QVERIFY(mFolder.isValid()); }
+    void initTestCase() { QVERIFY(m_folder.isValid()); }
 
     void limits_data()
     {
@@ -249,7 +249,7 @@ private Q_SLOTS:
         QVERIFY(XmlFile::load(path, document));
         QCOMPARE(document.ValueStr(), path);
 
-        const QString expectedPath = mFolder.filePath("expected.xml");
+        const QString expectedPath = m_folder.filePath("expected.xml");
         QVERIFY(expected.SaveFile(expectedPath.toLocal8Bit().constData()));
         QVERIFY(XmlFile::save(document, path));
         QCOMPARE(read(QString::fromStdString(path)), read(expectedPath));
@@ -284,11 +284,11 @@ private Q_SLOTS:
     void refusesWhatIsNoPlainFile()
     {
         TiXmlDocument document;
-        QVERIFY(!XmlFile::load(mFolder.filePath("missing.xml").toStdString(), document));
-        QVERIFY(!XmlFile::load(mFolder.path().toStdString(), document));
+        QVERIFY(!XmlFile::load(m_folder.filePath("missing.xml").toStdString(), document));
+        QVERIFY(!XmlFile::load(m_folder.path().toStdString(), document));
         QVERIFY(!XmlFile::load("", document));
         QVERIFY(!XmlFile::load("/dev/zero", document));
-        const std::string pipe = mFolder.filePath("pipe.xml").toStdString();
+        const std::string pipe = m_folder.filePath("pipe.xml").toStdString();
         QVERIFY(::mkfifo(pipe.c_str(), 0600) == 0);
         QVERIFY(!XmlFile::load(pipe, document));
     }
@@ -296,7 +296,7 @@ private Q_SLOTS:
 private:
     QString write(const QByteArray& bytes)
     {
-        const QString path = mFolder.filePath("file.xml");
+        const QString path = m_folder.filePath("file.xml");
         QFile file(path);
         if (!file.open(QIODevice::WriteOnly) || file.write(bytes) != bytes.size())
             qFatal("cannot write %s", qPrintable(path));
@@ -309,7 +309,7 @@ private:
         return file.open(QIODevice::ReadOnly) ? file.readAll() : QByteArray();
     }
 
-    QTemporaryDir mFolder;
+    QTemporaryDir m_folder;
 };
 
 QTEST_GUILESS_MAIN(tst_xmlfile)

@@ -20,20 +20,20 @@
 class Row : public KSBaseItemWidget
 {
 public:
-    explicit Row(const QString& name, bool hasClone = true) : mHasClone(hasClone)
+    explicit Row(const QString& name, bool hasClone = true) : m_hasClone(hasClone)
     {
         setObjectName(name);
         setFixedHeight(100);
     }
     KSBaseItemWidget* clone() override
     {
-        if (!mHasClone)
+        if (!m_hasClone)
             return nullptr;
         auto* copy = new Row(objectName() + QStringLiteral(" clone"));
         copy->setFixedSize(size());
         return copy;
     }
-    bool mHasClone;
+    bool m_hasClone;
 };
 
 // A list of rows in a window with the application's event filter, fingers of a touch device, and a clock that
@@ -45,24 +45,24 @@ public:
     static constexpr int HEIGHT = 500;
     static constexpr int ROW = 104; // height with the gap
 
-    explicit ScrollViewerFixture(TouchDevice& device) : mDevice(device)
+    explicit ScrollViewerFixture(TouchDevice& device) : m_device(device)
     {
-        mFilter.registerLockObject(&mFilter, nullptr, LOCKOBJECT_DEFAULTMUTEX, nullptr);
-        QCoreApplication::instance()->installEventFilter(&mFilter);
-        mWindow.resize(800, 700);
-        mList = new KSScrollViewerWidget(&mWindow);
-        mList->move(100, 100);
-        mList->setSize(WIDTH, HEIGHT);
-        mList->setHEffectiveArea(38, 362);
-        KSScrollViewerWidget::s_mainWnd = &mWindow;
+        m_filter.registerLockObject(&m_filter, nullptr, LOCKOBJECT_DEFAULTMUTEX, nullptr);
+        QCoreApplication::instance()->installEventFilter(&m_filter);
+        m_window.resize(800, 700);
+        m_list = new KSScrollViewerWidget(&m_window);
+        m_list->move(100, 100);
+        m_list->setSize(WIDTH, HEIGHT);
+        m_list->setHEffectiveArea(38, 362);
+        KSScrollViewerWidget::s_mainWnd = &m_window;
         record();
-        mWindow.show();
-        if (!QTest::qWaitForWindowExposed(&mWindow, PATIENCE_MS))
+        m_window.show();
+        if (!QTest::qWaitForWindowExposed(&m_window, PATIENCE_MS))
             qFatal("no window");
     }
     ~ScrollViewerFixture() override
     {
-        QCoreApplication::instance()->removeEventFilter(&mFilter);
+        QCoreApplication::instance()->removeEventFilter(&m_filter);
         KSScrollViewerWidget::s_mainWnd.clear();
     }
 
@@ -71,17 +71,17 @@ public:
         QList<KSBaseItemWidget*> items;
         for (int i = 0; i < rows; ++i)
             items.append(new Row(QString::number(i), withClones));
-        mList->addWidgetItems(&items, -1);
+        m_list->addWidgetItems(&items, -1);
         log.clear();
     }
 
     // Fingers in coordinates of the list
-    void press(int x, int y, int id = 0) { touch().press(id, QPoint(x, y), mList); }
-    void move(int x, int y, int id = 0) { touch().move(id, QPoint(x, y), mList); }
-    void release(int x, int y, int id = 0) { touch().release(id, QPoint(x, y), mList); }
-    QTest::QTouchEventWidgetSequence touch() { return QTest::touchEvent(&mWindow, mDevice); }
+    void press(int x, int y, int id = 0) { touch().press(id, QPoint(x, y), m_list); }
+    void move(int x, int y, int id = 0) { touch().move(id, QPoint(x, y), m_list); }
+    void release(int x, int y, int id = 0) { touch().release(id, QPoint(x, y), m_list); }
+    QTest::QTouchEventWidgetSequence touch() { return QTest::touchEvent(&m_window, m_device); }
     // Returns a sequence for several fingers, which keeps their positions. Each step ends with commit().
-    QTest::QTouchEventWidgetSequence fingers() { return QTest::touchEvent(&mWindow, mDevice, false); }
+    QTest::QTouchEventWidgetSequence fingers() { return QTest::touchEvent(&m_window, m_device, false); }
     void tap(int x, int y)
     {
         press(x, y);
@@ -96,22 +96,22 @@ public:
         }
     }
 
-    int value() const { return mList->verticalScrollBar()->value(); }
-    int maximum() const { return mList->verticalScrollBar()->maximum(); }
+    int value() const { return m_list->verticalScrollBar()->value(); }
+    int maximum() const { return m_list->verticalScrollBar()->maximum(); }
     QStringList order() const
     {
         QStringList names;
-        for (int i = 0; i < mList->count(); ++i)
-            names.append(mList->getWidgetItem(i)->objectName());
+        for (int i = 0; i < m_list->count(); ++i)
+            names.append(m_list->getWidgetItem(i)->objectName());
         return names;
     }
     QStringList takeLog() { return std::exchange(log, {}); }
 
     ManualClock clock; // declared before all widgets, which use it
-    KSAppEventFilter mFilter;
-    QWidget mWindow;
-    KSScrollViewerWidget* mList = nullptr;
-    TouchDevice& mDevice;
+    KSAppEventFilter m_filter;
+    QWidget m_window;
+    KSScrollViewerWidget* m_list = nullptr;
+    TouchDevice& m_device;
     QStringList log;
     bool answerWillFlick = true;
 
@@ -127,16 +127,16 @@ private:
         const auto noteAs = [this](const char* what) {
             return [this, what](KSBaseItemWidget* item, QPoint, KSScrollViewerWidget*) { note(what, item); };
         };
-        connect(mList, &List::widgetItemPressed, this, noteAs("pressed"));
-        connect(mList, &List::widgetItemReleased, this, noteAs("released"));
-        connect(mList, &List::widgetItemClicked, this, noteAs("clicked"));
-        connect(mList, &List::widgetItemLongHold, this, noteAs("held"));
-        connect(mList, &List::widgetItemRightPressed, this, noteAs("right"));
-        connect(mList, &List::widgetItemChangeColor, this, noteAs("colour"));
-        connect(mList, &List::signalItemDrop, this, [this] { log.append(QStringLiteral("dropped")); });
-        connect(mList, &List::signalDragOneItem, this,
+        connect(m_list, &List::widgetItemPressed, this, noteAs("pressed"));
+        connect(m_list, &List::widgetItemReleased, this, noteAs("released"));
+        connect(m_list, &List::widgetItemClicked, this, noteAs("clicked"));
+        connect(m_list, &List::widgetItemLongHold, this, noteAs("held"));
+        connect(m_list, &List::widgetItemRightPressed, this, noteAs("right"));
+        connect(m_list, &List::widgetItemChangeColor, this, noteAs("colour"));
+        connect(m_list, &List::signalItemDrop, this, [this] { log.append(QStringLiteral("dropped")); });
+        connect(m_list, &List::signalDragOneItem, this,
                 [this](KSBaseItemWidget* item, int, KSScrollViewerWidget*) { note("lifted", item); });
-        connect(mList, &List::signalFlick, this,
+        connect(m_list, &List::signalFlick, this,
                 [this](KSBaseItemWidget*, QPoint, KSScrollViewerWidget*, bool& willFlick) {
                     willFlick = willFlick || answerWillFlick;
                 });

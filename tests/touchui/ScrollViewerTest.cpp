@@ -7,7 +7,7 @@ void ScrollViewerTest::init()
 
 void ScrollViewerTest::cleanup()
 {
-    const bool locked = !m->mFilter.activateLockObjects().isEmpty();
+    const bool locked = !m->m_filter.activateLockObjects().isEmpty();
     m.reset();
     QVERIFY2(!locked, "a touch lock is left");
 }
@@ -15,12 +15,12 @@ void ScrollViewerTest::cleanup()
 // With a finger on the row's handle until it is off the list.
 void ScrollViewerTest::lift(int row)
 {
-    m->mList->setItemsDragFlagAlignment(DRAGFLAG_LEFT);
+    m->m_list->setItemsDragFlagAlignment(DRAGFLAG_LEFT);
     m->fill(20);
-    m->mList->slotItemsCanDrag(true);
+    m->m_list->slotItemsCanDrag(true);
     m->press(50, row * ScrollViewerFixture::ROW + 50);
     m->clock.advance(50);
-    QVERIFY(m->mList->isDragging());
+    QVERIFY(m->m_list->isDragging());
     QCOMPARE(m->takeLog(), QStringList{QStringLiteral("lifted %1").arg(row)});
-    QCOMPARE(m->mList->count(), 19);
+    QCOMPARE(m->m_list->count(), 19);
 }

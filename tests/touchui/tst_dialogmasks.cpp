@@ -10,7 +10,7 @@ class tst_dialogmasks : public QObject
     Q_OBJECT
 
 private Q_SLOTS:
-    void init() { mOwner = std::make_unique<QWidget>(); }
+    void init() { m_owner = std::make_unique<QWidget>(); }
     void touchesReachTheOwnerWithoutMasks_data();
     void touchesReachTheOwnerWithoutMasks();
     void masksAreMadeAtFirstUse();
@@ -18,10 +18,10 @@ private Q_SLOTS:
     void pressesEndWhereAskedFor();
 
 private:
-    QList<QWidget*> masks() const { return mOwner->findChildren<QWidget*>(); }
-    bool takesTouches() const { return mOwner->testAttribute(Qt::WA_AcceptTouchEvents); }
+    QList<QWidget*> masks() const { return m_owner->findChildren<QWidget*>(); }
+    bool takesTouches() const { return m_owner->testAttribute(Qt::WA_AcceptTouchEvents); }
 
-    std::unique_ptr<QWidget> mOwner;
+    std::unique_ptr<QWidget> m_owner;
 };
 
 void tst_dialogmasks::touchesReachTheOwnerWithoutMasks_data()
@@ -41,7 +41,7 @@ void tst_dialogmasks::touchesReachTheOwnerWithoutMasks_data()
 void tst_dialogmasks::touchesReachTheOwnerWithoutMasks()
 {
     QFETCH(QString, steps);
-    DialogMasks both(mOwner.get());
+    DialogMasks both(m_owner.get());
     for (const QChar step : steps)
         if (step.toUpper() == QLatin1Char('D'))
             both.showDialogMaskWidget(step.isUpper());
@@ -52,7 +52,7 @@ void tst_dialogmasks::touchesReachTheOwnerWithoutMasks()
 
 void tst_dialogmasks::masksAreMadeAtFirstUse()
 {
-    DialogMasks both(mOwner.get());
+    DialogMasks both(m_owner.get());
     both.showDialogMaskWidget(false);
     QVERIFY(masks().isEmpty());
     both.showDialogMaskWidget(true);
@@ -70,18 +70,18 @@ void tst_dialogmasks::masksAreMadeAtFirstUse()
 
 void tst_dialogmasks::marginsStayFree()
 {
-    mOwner->resize(300, 200);
-    DialogMasks both(mOwner.get(), QMargins(10, 6, 9, 12));
+    m_owner->resize(300, 200);
+    DialogMasks both(m_owner.get(), QMargins(10, 6, 9, 12));
     both.showMessageMaskWidget(true);
     QCOMPARE(masks().constFirst()->geometry(), QRect(10, 6, 281, 182));
 }
 
 void tst_dialogmasks::pressesEndWhereAskedFor()
 {
-    DialogMasks through(mOwner.get());
+    DialogMasks through(m_owner.get());
     through.showDialogMaskWidget(true);
     QVERIFY(!masks().constLast()->testAttribute(Qt::WA_NoMousePropagation));
-    DialogMasks here(mOwner.get(), QMargins(), DialogMasks::Press::EndsHere);
+    DialogMasks here(m_owner.get(), QMargins(), DialogMasks::Press::EndsHere);
     here.showDialogMaskWidget(true);
     QVERIFY(masks().constLast()->testAttribute(Qt::WA_NoMousePropagation));
 }

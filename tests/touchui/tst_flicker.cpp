@@ -41,8 +41,8 @@ class tst_flicker : public QObject
 {
     Q_OBJECT
 private Q_SLOTS:
-    void init() { mClock = std::make_unique<ManualClock>(); }
-    void cleanup() { mClock.reset(); }
+    void init() { m_clock = std::make_unique<ManualClock>(); }
+    void cleanup() { m_clock.reset(); }
 
     void followsTheFingerAndRests()
     {
@@ -56,16 +56,16 @@ private Q_SLOTS:
         QCOMPARE(started.count(), 1);
         QVERIFY(list.flicker.hasFlicked());
         QVERIFY(list.flicker.isMove());
-        mClock->advance(TICK);
+        m_clock->advance(TICK);
         QCOMPARE(list.value(), 550); // half of the way
-        mClock->advance(20 * TICK);
+        m_clock->advance(20 * TICK);
         QVERIFY(list.flicker.isEnd());
         QVERIFY(!list.flicker.isRunning());
         QCOMPARE(list.ends, QList<Flicker::End>{Flicker::End::Rest});
         QVERIFY(qAbs(list.value() - 600) <= 10);
         list.flicker.lift(QPointF(10, 10));
         QVERIFY(!list.flicker.isGliding());
-        QCOMPARE(mClock->running(), 0);
+        QCOMPARE(m_clock->running(), 0);
     }
 
     void firstMoveCountsWhereTheRulesSaySo()
@@ -74,7 +74,7 @@ private Q_SLOTS:
         list.flicker.begin(QPointF(10, 100));
         list.flicker.follow(QPointF(10, 60));
         QVERIFY(list.flicker.isRunning());
-        mClock->advance(TICK);
+        m_clock->advance(TICK);
         QCOMPARE(list.value(), 520);
     }
 
@@ -86,11 +86,11 @@ private Q_SLOTS:
         list.flicker.lift(QPointF(10, 70));
         QVERIFY(list.flicker.isGliding());
         QVERIFY(!list.flicker.isFollowing());
-        mClock->advance(1000 * TICK);
+        m_clock->advance(1000 * TICK);
         QVERIFY(!list.flicker.isGliding());
         QCOMPARE(list.ends, QList<Flicker::End>{Flicker::End::Glide});
         QVERIFY(list.value() > 530);
-        QCOMPARE(mClock->running(), 0);
+        QCOMPARE(m_clock->running(), 0);
     }
 
     void glideDiesAtTheLimit()
@@ -99,7 +99,7 @@ private Q_SLOTS:
         list.flicker.begin(QPointF(10, 0));
         list.flicker.follow(QPointF(10, 0));
         list.flicker.lift(QPointF(10, 400));
-        mClock->advance(1000 * TICK);
+        m_clock->advance(1000 * TICK);
         QCOMPARE(list.value(), 0);
         QCOMPARE(list.ends, QList<Flicker::End>{Flicker::End::Limit});
         QVERIFY(!list.flicker.isRunning());
@@ -121,7 +121,7 @@ private Q_SLOTS:
         list.flicker.begin(QPointF(10, 0));
         list.flicker.follow(QPointF(10, 0));
         list.flicker.follow(QPointF(10, 400));
-        mClock->advance(TICK);
+        m_clock->advance(TICK);
         QCOMPARE(list.value(), 0);
         QCOMPARE(list.flicker.isRunning(), !viewer);
         QCOMPARE(list.ends.contains(Flicker::End::Limit), viewer);
@@ -172,7 +172,7 @@ private Q_SLOTS:
     }
 
 private:
-    std::unique_ptr<ManualClock> mClock;
+    std::unique_ptr<ManualClock> m_clock;
 };
 
 QTEST_MAIN(tst_flicker)

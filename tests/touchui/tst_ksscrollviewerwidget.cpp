@@ -58,7 +58,7 @@ void tst_ksscrollviewerwidget::tap()
     m->fill(20);
     m->press(100, 150);
     QCOMPARE(m->takeLog(), Names{"pressed 1"});
-    QVERIFY(!m->mFilter.activateLockObjects().isEmpty());
+    QVERIFY(!m->m_filter.activateLockObjects().isEmpty());
     m->release(100, 150);
     QCOMPARE(m->takeLog(), (Names{"released 1", "clicked 1"}));
     m->clock.advance(2000);
@@ -88,7 +88,7 @@ void tst_ksscrollviewerwidget::tapBelowTheLastRow()
 void tst_ksscrollviewerwidget::tapBesideTheRowsSaysNothing()
 {
     m->fill(20);
-    m->mList->setHEffectiveArea(200, 200);
+    m->m_list->setHEffectiveArea(200, 200);
     m->press(150, 150);
     m->clock.advance(800);
     m->release(150, 150);
@@ -178,7 +178,7 @@ void tst_ksscrollviewerwidget::slopOfTheMouse()
     QFETCH(QPoint, way);
     QFETCH(bool, held);
     m->fill(20);
-    QWidget* row = m->mList->getWidgetItem(1);
+    QWidget* row = m->m_list->getWidgetItem(1);
     QTest::mousePress(row, Qt::LeftButton, Qt::NoModifier, QPoint(60, 50));
     QTest::mouseMove(row, QPoint(60, 50) + way);
     QCOMPARE(m->takeLog(), Names{"pressed 1"});
@@ -190,23 +190,23 @@ void tst_ksscrollviewerwidget::slopOfTheMouse()
 void tst_ksscrollviewerwidget::rightPress()
 {
     m->fill(2);
-    QTest::mouseClick(m->mList->getWidgetItem(1), Qt::RightButton);
+    QTest::mouseClick(m->m_list->getWidgetItem(1), Qt::RightButton);
     m->clock.advance(800);
     QCOMPARE(m->takeLog(), Names{"right 1"});
-    QTest::mouseClick(m->mList->viewport(), Qt::RightButton, Qt::NoModifier, QPoint(100, 450));
+    QTest::mouseClick(m->m_list->viewport(), Qt::RightButton, Qt::NoModifier, QPoint(100, 450));
     QCOMPARE(m->takeLog(), Names{"right -"});
 }
 
 void tst_ksscrollviewerwidget::scrollFollowsTheFinger()
 {
     m->fill(20);
-    QSignalSpy visible(m->mList, &KSScrollViewerWidget::signalVisibleItemsChange);
+    QSignalSpy visible(m->m_list, &KSScrollViewerWidget::signalVisibleItemsChange);
     m->press(100, 495);
     m->move(100, 490); // where the motion starts
     m->drag(100, 490, 190, 10);
     m->clock.advance(33 * 8);
     QVERIFY2(qAbs(m->value() - 300) <= 15, qPrintable(QString::number(m->value())));
-    QCOMPARE(m->mList->firstVisibleItem(), m->value() / ScrollViewerFixture::ROW);
+    QCOMPARE(m->m_list->firstVisibleItem(), m->value() / ScrollViewerFixture::ROW);
     QVERIFY(visible.count() >= 3);
     m->takeLog();
     // The finger has come to rest before it leaves.
@@ -226,10 +226,10 @@ void tst_ksscrollviewerwidget::fiveFirstPixelsAreNoFlick()
     m->move(100, 145);
     m->clock.advance(330);
     QCOMPARE(m->value(), 0);
-    QVERIFY(!m->mList->hasFlicked());
+    QVERIFY(!m->m_list->hasFlicked());
     m->release(100, 145);
     QCOMPARE(m->takeLog(), (Names{"pressed 1", "released 1", "clicked 1"}));
-    QVERIFY(!m->mList->isAutoFilck());
+    QVERIFY(!m->m_list->isAutoFilck());
 }
 
 void tst_ksscrollviewerwidget::flickGlidesAndRests()
@@ -239,11 +239,11 @@ void tst_ksscrollviewerwidget::flickGlidesAndRests()
     m->drag(100, 400, 340, 3);
     m->move(100, 300);
     m->release(100, 300);
-    QVERIFY(m->mList->isAutoFilck());
+    QVERIFY(m->m_list->isAutoFilck());
     int last = m->value();
     int step = 0;
     int ticks = 0;
-    for (; m->mList->isAutoFilck() && ticks < 1000; ++ticks) {
+    for (; m->m_list->isAutoFilck() && ticks < 1000; ++ticks) {
         m->clock.advance(33);
         const int now = m->value() - last;
         QVERIFY2(now <= step || ticks == 0, "the flick speeds up");
@@ -266,10 +266,10 @@ void tst_ksscrollviewerwidget::flickDiesAtTheEnd()
     m->drag(100, 450, 400, 3);
     m->move(100, 50);
     m->release(100, 50);
-    QVERIFY(m->mList->isAutoFilck());
+    QVERIFY(m->m_list->isAutoFilck());
     m->clock.advance(33 * 3);
     QCOMPARE(m->value(), end);
-    QVERIFY(!m->mList->isAutoFilck());
+    QVERIFY(!m->m_list->isAutoFilck());
     QCOMPARE(m->clock.running(), 0);
     // And at the start.
     m->press(100, 50);
@@ -312,10 +312,10 @@ void tst_ksscrollviewerwidget::brakeTapsNothing()
     m->move(100, 100);
     m->release(100, 100);
     m->clock.advance(99);
-    QVERIFY(m->mList->isAutoFilck());
+    QVERIFY(m->m_list->isAutoFilck());
     m->takeLog();
     m->press(100, 250);
-    QVERIFY(!m->mList->isAutoFilck());
+    QVERIFY(!m->m_list->isAutoFilck());
     const int braked = m->value();
     m->clock.advance(2000); // nor does it become a hold
     m->release(100, 250);
@@ -336,10 +336,10 @@ void tst_ksscrollviewerwidget::boundedDragDoesNotRunOn()
         m->move(100, -300);
         m->clock.advance(33);
     }
-    const int top = m->mList->getWidgetItem(2)->mapTo(m->mList, QPoint()).y();
+    const int top = m->m_list->getWidgetItem(2)->mapTo(m->m_list, QPoint()).y();
     QVERIFY2(top >= 0 && top <= 1, qPrintable(QString::number(top)));
     m->release(100, -300);
-    QVERIFY(!m->mList->isAutoFilck());
+    QVERIFY(!m->m_list->isAutoFilck());
     const int rest = m->value();
     m->clock.advance(3000);
     QCOMPARE(m->value(), rest);
@@ -359,11 +359,11 @@ void tst_ksscrollviewerwidget::switchedOffItDoesNotFollow()
     m->fill(20);
     m->press(100, 400);
     m->move(100, 390);
-    m->mList->setFlickAbility(false);
+    m->m_list->setFlickAbility(false);
     m->drag(100, 390, 100, 10);
     m->release(100, 100);
     QCOMPARE(m->value(), 0);
-    QVERIFY(!m->mList->isAutoFilck());
+    QVERIFY(!m->m_list->isAutoFilck());
     m->takeLog();
     m->tap(100, 150); // on again, and nothing to brake
     QCOMPARE(m->takeLog(), (Names{"pressed 1", "released 1", "clicked 1"}));
@@ -372,21 +372,21 @@ void tst_ksscrollviewerwidget::switchedOffItDoesNotFollow()
 void tst_ksscrollviewerwidget::takenTouchGoesToTheRow()
 {
     m->fill(20);
-    m->mList->setIsTake(true);
-    QSignalSpy down(m->mList->getWidgetItem(1), &QAbstractButton::pressed);
+    m->m_list->setIsTake(true);
+    QSignalSpy down(m->m_list->getWidgetItem(1), &QAbstractButton::pressed);
     m->press(100, 150);
     QCOMPARE(down.count(), 1);
     m->drag(100, 150, 50, 5);
     QCOMPARE(m->value(), 0);
     m->release(100, 50);
-    m->mList->setIsTake(false);
+    m->m_list->setIsTake(false);
 }
 
 void tst_ksscrollviewerwidget::mouseDragScrolls()
 {
     m->fill(20);
-    QWidget* viewport = m->mList->viewport();
-    QTest::mousePress(m->mList->getWidgetItem(3), Qt::LeftButton, Qt::NoModifier, QPoint(60, 50));
+    QWidget* viewport = m->m_list->viewport();
+    QTest::mousePress(m->m_list->getWidgetItem(3), Qt::LeftButton, Qt::NoModifier, QPoint(60, 50));
     for (int y = 360; y >= 160; y -= 20)
         QTest::mouseMove(viewport, QPoint(100, y));
     QTest::mouseRelease(viewport, Qt::LeftButton, Qt::NoModifier, QPoint(100, 160));
@@ -399,8 +399,8 @@ void tst_ksscrollviewerwidget::mouseDragScrolls()
 void tst_ksscrollviewerwidget::mouseKeepsTheRowInside()
 {
     m->fill(20);
-    QWidget* viewport = m->mList->viewport();
-    QTest::mousePress(m->mList->getWidgetItem(3), Qt::LeftButton, Qt::NoModifier, QPoint(60, 50));
+    QWidget* viewport = m->m_list->viewport();
+    QTest::mousePress(m->m_list->getWidgetItem(3), Qt::LeftButton, Qt::NoModifier, QPoint(60, 50));
     for (int y = 360; y >= -400; y -= 20)
         QTest::mouseMove(viewport, QPoint(100, y));
     QCOMPARE(m->value(), 3 * ScrollViewerFixture::ROW);
@@ -411,13 +411,13 @@ void tst_ksscrollviewerwidget::secondFingerOnAnotherRow()
 {
     m->fill(20);
     auto fingers = m->fingers();
-    fingers.press(0, QPoint(100, 50), m->mList).commit();
-    fingers.stationary(0).press(1, QPoint(300, 450), m->mList).commit();
-    fingers.stationary(0).move(1, QPoint(300, 100), m->mList).commit();
+    fingers.press(0, QPoint(100, 50), m->m_list).commit();
+    fingers.stationary(0).press(1, QPoint(300, 450), m->m_list).commit();
+    fingers.stationary(0).move(1, QPoint(300, 100), m->m_list).commit();
     m->clock.advance(330);
     QCOMPARE(m->value(), 0);
-    fingers.stationary(0).release(1, QPoint(300, 100), m->mList).commit();
-    fingers.release(0, QPoint(100, 50), m->mList).commit();
+    fingers.stationary(0).release(1, QPoint(300, 100), m->m_list).commit();
+    fingers.release(0, QPoint(100, 50), m->m_list).commit();
     QCOMPARE(m->takeLog(), (Names{"pressed 0", "released 0", "clicked 0"}));
 }
 
@@ -425,11 +425,11 @@ void tst_ksscrollviewerwidget::secondFingerOnTheSameRow()
 {
     m->fill(20);
     auto fingers = m->fingers();
-    fingers.press(0, QPoint(100, 50), m->mList).commit();
-    fingers.stationary(0).press(1, QPoint(140, 50), m->mList).commit();
-    fingers.stationary(0).move(1, QPoint(140, 300), m->mList).commit();
-    fingers.stationary(0).release(1, QPoint(140, 300), m->mList).commit();
-    fingers.release(0, QPoint(100, 50), m->mList).commit();
+    fingers.press(0, QPoint(100, 50), m->m_list).commit();
+    fingers.stationary(0).press(1, QPoint(140, 50), m->m_list).commit();
+    fingers.stationary(0).move(1, QPoint(140, 300), m->m_list).commit();
+    fingers.stationary(0).release(1, QPoint(140, 300), m->m_list).commit();
+    fingers.release(0, QPoint(100, 50), m->m_list).commit();
     QCOMPARE(m->takeLog(), (Names{"pressed 0", "released 0", "clicked 0"}));
     QCOMPARE(m->value(), 0);
 }
@@ -438,12 +438,12 @@ void tst_ksscrollviewerwidget::firstFingerLiftedFirst()
 {
     m->fill(20);
     auto fingers = m->fingers();
-    fingers.press(0, QPoint(100, 50), m->mList).commit();
-    fingers.stationary(0).press(1, QPoint(140, 50), m->mList).commit();
-    fingers.release(0, QPoint(100, 50), m->mList).stationary(1).commit();
+    fingers.press(0, QPoint(100, 50), m->m_list).commit();
+    fingers.stationary(0).press(1, QPoint(140, 50), m->m_list).commit();
+    fingers.release(0, QPoint(100, 50), m->m_list).stationary(1).commit();
     QCOMPARE(m->takeLog(), (Names{"pressed 0", "released 0", "clicked 0"}));
-    fingers.move(1, QPoint(140, 90), m->mList).commit();
-    fingers.release(1, QPoint(140, 90), m->mList).commit();
+    fingers.move(1, QPoint(140, 90), m->m_list).commit();
+    fingers.release(1, QPoint(140, 90), m->m_list).commit();
     QCOMPARE(m->takeLog(), Names());
     QCOMPARE(m->clock.running(), 0);
 }
@@ -454,7 +454,7 @@ void tst_ksscrollviewerwidget::cancelledTap()
     m->press(100, 150);
     m->takeLog();
     QTouchEvent cancel(QEvent::TouchCancel, m_device);
-    QCoreApplication::sendEvent(m->mList->getWidgetItem(1), &cancel);
+    QCoreApplication::sendEvent(m->m_list->getWidgetItem(1), &cancel);
     m->clock.advance(2000);
     QCOMPARE(m->takeLog(), Names());
     m->release(100, 150);
@@ -466,12 +466,12 @@ void tst_ksscrollviewerwidget::cancelledTap()
 void tst_ksscrollviewerwidget::cancelledDrag()
 {
     lift(1);
-    KSBaseItemWidget* row = m->mList->getSelectedItem();
+    KSBaseItemWidget* row = m->m_list->getSelectedItem();
     m->move(50, 160);
     m->move(50, 264);
     QTouchEvent cancel(QEvent::TouchCancel, m_device);
     QCoreApplication::sendEvent(row, &cancel);
-    QVERIFY(!m->mList->isDragging());
+    QVERIFY(!m->m_list->isDragging());
     QCOMPARE(m->order().mid(0, 4), (Names{"0", "1", "2", "3"}));
     QCOMPARE(m->takeLog(), Names{"dropped"});
     m->release(50, 264);
@@ -484,12 +484,12 @@ void tst_ksscrollviewerwidget::hidingEndsThePress()
     m->fill(20);
     m->press(100, 150);
     m->takeLog();
-    m->mList->hide();
+    m->m_list->hide();
     m->clock.advance(2000);
     m->release(100, 150);
     QCOMPARE(m->takeLog(), Names());
     QCOMPARE(m->clock.running(), 0);
-    m->mList->show();
+    m->m_list->show();
 }
 
 void tst_ksscrollviewerwidget::clearedUnderTheFinger()
@@ -497,14 +497,14 @@ void tst_ksscrollviewerwidget::clearedUnderTheFinger()
     m->fill(20);
     m->press(100, 150);
     m->takeLog();
-    for (int i = m->mList->count() - 1; i >= 0; --i)
-        delete m->mList->getWidgetItem(i);
+    for (int i = m->m_list->count() - 1; i >= 0; --i)
+        delete m->m_list->getWidgetItem(i);
     m->clock.advance(2000);
     m->move(100, 300);
     m->release(100, 300);
     QVERIFY(!m->takeLog().join(QLatin1Char(' ')).contains(QLatin1Char('1')));
     // The row was the target, so its lock waits for the watchdog.
-    m->mFilter.resetLock();
+    m->m_filter.resetLock();
 }
 
 void tst_ksscrollviewerwidget::remoteLockMidTouch()
@@ -512,7 +512,7 @@ void tst_ksscrollviewerwidget::remoteLockMidTouch()
     m->fill(20);
     m->press(100, 150);
     QCOMPARE(m->takeLog(), Names{"pressed 1"});
-    m->mFilter.resetLock(); // as another process's lock does
+    m->m_filter.resetLock(); // as another process's lock does
     m->move(100, 400);
     m->release(100, 400);
     QCOMPARE(m->takeLog(), Names());
@@ -528,7 +528,7 @@ void tst_ksscrollviewerwidget::timersCanStartAnew()
     m->press(100, 150);
     m->takeLog();
     m->clock.advance(600);
-    m->mList->allTimersReset();
+    m->m_list->allTimersReset();
     m->clock.advance(600);
     QCOMPARE(m->takeLog(), Names());
     m->clock.advance(100);
@@ -536,7 +536,7 @@ void tst_ksscrollviewerwidget::timersCanStartAnew()
     m->release(100, 150);
     m->press(100, 150);
     m->takeLog();
-    m->mList->stopTapAndHoldTimer();
+    m->m_list->stopTapAndHoldTimer();
     m->clock.advance(900);
     QCOMPARE(m->takeLog(), Names());
     m->release(100, 150);
@@ -545,13 +545,13 @@ void tst_ksscrollviewerwidget::timersCanStartAnew()
 void tst_ksscrollviewerwidget::stretchTimerAligns()
 {
     m->fill(20);
-    m->mList->slotSetScrollBarValue(130);
-    QSignalSpy stopped(m->mList, &KSScrollViewerWidget::minitrimStop);
-    m->mList->slotHandleStretchTimer();
+    m->m_list->slotSetScrollBarValue(130);
+    QSignalSpy stopped(m->m_list, &KSScrollViewerWidget::minitrimStop);
+    m->m_list->slotHandleStretchTimer();
     QCOMPARE(m->value(), ScrollViewerFixture::ROW);
     QCOMPARE(stopped.count(), 1);
-    m->mList->slotSetScrollBarValue(m->maximum());
-    m->mList->slotHandleStretchTimer();
+    m->m_list->slotSetScrollBarValue(m->maximum());
+    m->m_list->slotHandleStretchTimer();
     QCOMPARE(m->value(), m->maximum());
     QCOMPARE(stopped.count(), 2);
 }
@@ -559,7 +559,7 @@ void tst_ksscrollviewerwidget::stretchTimerAligns()
 void tst_ksscrollviewerwidget::barUnderTheFinger()
 {
     m->fill(20);
-    KSScrollBar* bar = m->mList->getVScrollBar();
+    KSScrollBar* bar = m->m_list->getVScrollBar();
     QVERIFY(bar->isVisible());
     const QRect handle = bar->handleRect();
     QTest::touchEvent(bar, m_device).press(0, handle.center());
@@ -585,10 +585,10 @@ void tst_ksscrollviewerwidget::pressOnTheBarBrakes()
     m->drag(100, 400, 340, 3);
     m->move(100, 100);
     m->release(100, 100);
-    QVERIFY(m->mList->isAutoFilck());
-    KSScrollBar* bar = m->mList->getVScrollBar();
+    QVERIFY(m->m_list->isAutoFilck());
+    KSScrollBar* bar = m->m_list->getVScrollBar();
     QTest::touchEvent(bar, m_device).press(0, bar->handleRect().center());
-    QVERIFY(!m->mList->isAutoFilck());
+    QVERIFY(!m->m_list->isAutoFilck());
     QTest::touchEvent(bar, m_device).release(0, bar->handleRect().center());
     QCOMPARE(m->clock.running(), 0);
 }

@@ -88,26 +88,26 @@ void tst_ksscrollviewerwidget_layout::cleanup()
 void tst_ksscrollviewerwidget_layout::wheel(int delta)
 {
     const QPoint pos(200, 200);
-    QWheelEvent event(pos, m->mList->mapToGlobal(pos), QPoint(), QPoint(0, delta), Qt::NoButton,
+    QWheelEvent event(pos, m->m_list->mapToGlobal(pos), QPoint(), QPoint(0, delta), Qt::NoButton,
                       Qt::NoModifier, Qt::NoScrollPhase, false);
-    QCoreApplication::sendEvent(m->mList->viewport(), &event);
+    QCoreApplication::sendEvent(m->m_list->viewport(), &event);
 }
 
 void tst_ksscrollviewerwidget_layout::emptyList()
 {
-    QVERIFY(m->mList->isEmpty());
-    QCOMPARE(m->mList->count(), 0);
+    QVERIFY(m->m_list->isEmpty());
+    QCOMPARE(m->m_list->count(), 0);
     QCOMPARE(m->maximum(), 0);
-    QCOMPARE(m->mList->getVScrollBar()->maximum(), 0);
-    QCOMPARE(m->mList->widget()->height(), 0);
-    QCOMPARE(m->mList->firstVisibleItem(), -1);
-    QCOMPARE(m->mList->lastVisibleItem(), -1);
-    m->mList->removeAll();
-    m->mList->removeWidgetItem(0);
-    m->mList->removeWidgetItem(nullptr);
-    m->mList->moveToWidgetItem(0);
-    m->mList->setLastVisibleItem(0);
-    m->mList->swap(0, 1);
+    QCOMPARE(m->m_list->getVScrollBar()->maximum(), 0);
+    QCOMPARE(m->m_list->widget()->height(), 0);
+    QCOMPARE(m->m_list->firstVisibleItem(), -1);
+    QCOMPARE(m->m_list->lastVisibleItem(), -1);
+    m->m_list->removeAll();
+    m->m_list->removeWidgetItem(0);
+    m->m_list->removeWidgetItem(nullptr);
+    m->m_list->moveToWidgetItem(0);
+    m->m_list->setLastVisibleItem(0);
+    m->m_list->swap(0, 1);
     wheel(-120);
     QCOMPARE(m->value(), 0);
 }
@@ -115,63 +115,63 @@ void tst_ksscrollviewerwidget_layout::emptyList()
 void tst_ksscrollviewerwidget_layout::rowsInTheirOrder()
 {
     m->fill(20);
-    QCOMPARE(m->mList->widget()->height(), 20 * ScrollViewerFixture::ROW - 4);
+    QCOMPARE(m->m_list->widget()->height(), 20 * ScrollViewerFixture::ROW - 4);
     QCOMPARE(m->maximum(), 20 * ScrollViewerFixture::ROW - 4 - ScrollViewerFixture::HEIGHT);
-    QCOMPARE(m->mList->verticalScrollBar()->pageStep(), ScrollViewerFixture::HEIGHT + 4);
-    QCOMPARE(m->mList->getVScrollBar()->pageStep(), ScrollViewerFixture::HEIGHT + 4);
+    QCOMPARE(m->m_list->verticalScrollBar()->pageStep(), ScrollViewerFixture::HEIGHT + 4);
+    QCOMPARE(m->m_list->getVScrollBar()->pageStep(), ScrollViewerFixture::HEIGHT + 4);
     for (int i = 0; i < 20; ++i) {
-        QCOMPARE(m->mList->getWidgetItem(i)->y(), i * ScrollViewerFixture::ROW);
-        QCOMPARE(m->mList->getWidgetItem(i)->width(), ScrollViewerFixture::WIDTH - 38);
-        QCOMPARE(m->mList->getIndexOfWidgetItem(m->mList->getWidgetItem(i)), i);
+        QCOMPARE(m->m_list->getWidgetItem(i)->y(), i * ScrollViewerFixture::ROW);
+        QCOMPARE(m->m_list->getWidgetItem(i)->width(), ScrollViewerFixture::WIDTH - 38);
+        QCOMPARE(m->m_list->getIndexOfWidgetItem(m->m_list->getWidgetItem(i)), i);
     }
-    m->mList->addWidgetItem(new Row(QStringLiteral("a")), 1);
-    m->mList->addWidgetItem(new Row(QStringLiteral("b")), -1);
-    m->mList->addWidgetItem(new Row(QStringLiteral("c")), 1000);
+    m->m_list->addWidgetItem(new Row(QStringLiteral("a")), 1);
+    m->m_list->addWidgetItem(new Row(QStringLiteral("b")), -1);
+    m->m_list->addWidgetItem(new Row(QStringLiteral("c")), 1000);
     QCOMPARE(m->order().mid(0, 3), (Names{"0", "a", "1"}));
     QCOMPARE(m->order().mid(20), (Names{"19", "b", "c"}));
-    QCOMPARE(m->mList->getWidgetItem(2)->y(), 2 * ScrollViewerFixture::ROW);
+    QCOMPARE(m->m_list->getWidgetItem(2)->y(), 2 * ScrollViewerFixture::ROW);
 }
 
 void tst_ksscrollviewerwidget_layout::addingNonsense()
 {
     m->fill(3);
-    m->mList->addWidgetItem(nullptr, 0);
-    m->mList->addWidgetItem(m->mList->getWidgetItem(1), 0);
-    m->mList->addWidgetItems(nullptr, 0);
-    QList<KSBaseItemWidget*> mixed{nullptr, m->mList->getWidgetItem(0), new Row(QStringLiteral("n"))};
-    m->mList->addWidgetItems(&mixed, 1);
+    m->m_list->addWidgetItem(nullptr, 0);
+    m->m_list->addWidgetItem(m->m_list->getWidgetItem(1), 0);
+    m->m_list->addWidgetItems(nullptr, 0);
+    QList<KSBaseItemWidget*> mixed{nullptr, m->m_list->getWidgetItem(0), new Row(QStringLiteral("n"))};
+    m->m_list->addWidgetItems(&mixed, 1);
     QCOMPARE(m->order(), (Names{"0", "n", "1", "2"}));
-    QVERIFY(!m->mList->getWidgetItem(-1));
-    QVERIFY(!m->mList->getWidgetItem(4));
-    QCOMPARE(m->mList->getIndexOfWidgetItem(nullptr), -1);
+    QVERIFY(!m->m_list->getWidgetItem(-1));
+    QVERIFY(!m->m_list->getWidgetItem(4));
+    QCOMPARE(m->m_list->getIndexOfWidgetItem(nullptr), -1);
 }
 
 void tst_ksscrollviewerwidget_layout::removing()
 {
     m->fill(10);
-    KSBaseItemWidget* gone = m->mList->getWidgetItem(2);
-    m->mList->removeWidgetItem(gone);
+    KSBaseItemWidget* gone = m->m_list->getWidgetItem(2);
+    m->m_list->removeWidgetItem(gone);
     QVERIFY(gone->isHidden());
-    m->mList->removeWidgetItem(0);
-    m->mList->removeWidgetItems(2, 3);
+    m->m_list->removeWidgetItem(0);
+    m->m_list->removeWidgetItems(2, 3);
     QCOMPARE(m->order(), (Names{"1", "3", "7", "8", "9"}));
-    m->mList->removeWidgetItems(m->mList->getWidgetItem(3), 100);
+    m->m_list->removeWidgetItems(m->m_list->getWidgetItem(3), 100);
     QCOMPARE(m->order(), (Names{"1", "3", "7"}));
-    m->mList->removeWidgetItems(1, 0);
-    m->mList->removeWidgetItems(-1, 2);
-    m->mList->removeWidgetItem(gone);
-    QCOMPARE(m->mList->count(), 3);
-    m->mList->removeAll();
-    QVERIFY(m->mList->isEmpty());
+    m->m_list->removeWidgetItems(1, 0);
+    m->m_list->removeWidgetItems(-1, 2);
+    m->m_list->removeWidgetItem(gone);
+    QCOMPARE(m->m_list->count(), 3);
+    m->m_list->removeAll();
+    QVERIFY(m->m_list->isEmpty());
     QCOMPARE(m->maximum(), 0);
 }
 
 void tst_ksscrollviewerwidget_layout::removedRowCanComeBack()
 {
     m->fill(3);
-    KSBaseItemWidget* row = m->mList->getWidgetItem(1);
-    m->mList->removeWidgetItem(row);
-    m->mList->addWidgetItem(row, 2);
+    KSBaseItemWidget* row = m->m_list->getWidgetItem(1);
+    m->m_list->removeWidgetItem(row);
+    m->m_list->addWidgetItem(row, 2);
     QCOMPARE(m->order(), (Names{"0", "2", "1"}));
     QVERIFY(row->isVisible());
     m->tap(100, 250);
@@ -181,58 +181,58 @@ void tst_ksscrollviewerwidget_layout::removedRowCanComeBack()
 void tst_ksscrollviewerwidget_layout::swapping()
 {
     m->fill(4);
-    m->mList->swap(0, 3);
-    m->mList->swap(m->mList->getWidgetItem(1), m->mList->getWidgetItem(2));
-    m->mList->swap(1, 1);
-    m->mList->swap(1, 9);
+    m->m_list->swap(0, 3);
+    m->m_list->swap(m->m_list->getWidgetItem(1), m->m_list->getWidgetItem(2));
+    m->m_list->swap(1, 1);
+    m->m_list->swap(1, 9);
     QCOMPARE(m->order(), (Names{"3", "2", "1", "0"}));
-    QCOMPARE(m->mList->getWidgetItem(0)->y(), 0);
+    QCOMPARE(m->m_list->getWidgetItem(0)->y(), 0);
 }
 
 void tst_ksscrollviewerwidget_layout::relayoutKeepsThePlace()
 {
     m->fill(20);
-    m->mList->slotSetScrollBarValue(730);
-    m->mList->addWidgetItem(new Row(QStringLiteral("new")), 0);
+    m->m_list->slotSetScrollBarValue(730);
+    m->m_list->addWidgetItem(new Row(QStringLiteral("new")), 0);
     QCOMPARE(m->value(), 730);
-    m->mList->slotHandleItemSizeChange();
+    m->m_list->slotHandleItemSizeChange();
     QCOMPARE(m->value(), 730);
-    m->mList->resize(m->mList->size());
-    m->mList->setSize(ScrollViewerFixture::WIDTH, 400);
+    m->m_list->resize(m->m_list->size());
+    m->m_list->setSize(ScrollViewerFixture::WIDTH, 400);
     QCOMPARE(m->value(), 730);
-    QCOMPARE(m->mList->getVScrollBar()->value(), 730);
-    m->mList->removeWidgetItems(2, 100);
+    QCOMPARE(m->m_list->getVScrollBar()->value(), 730);
+    m->m_list->removeWidgetItems(2, 100);
     QCOMPARE(m->value(), 0);
 }
 
 void tst_ksscrollviewerwidget_layout::growingRow()
 {
     m->fill(3);
-    m->mList->getWidgetItem(0)->setFixedHeight(300);
-    QTRY_COMPARE(m->mList->getWidgetItem(1)->y(), 304);
+    m->m_list->getWidgetItem(0)->setFixedHeight(300);
+    QTRY_COMPARE(m->m_list->getWidgetItem(1)->y(), 304);
     QCOMPARE(m->maximum(), 3 * ScrollViewerFixture::ROW - 4 + 200 - ScrollViewerFixture::HEIGHT);
 }
 
 void tst_ksscrollviewerwidget_layout::marginsAndSpacing()
 {
     m->fill(3);
-    m->mList->setMargins(1, 20, 3, 40);
-    m->mList->setSpacingBetweenItems(10);
-    QCOMPARE(m->mList->widget()->height(), 20 + 40 + 300 + 20);
-    QCOMPARE(m->mList->getWidgetItem(2)->y(), 20 + 2 * 110);
-    m->mList->setSpacingBetweenItemAndScrollbar(26);
-    QCOMPARE(m->mList->getSpacingBetweenItemAndScrollbar(), 26);
-    QCOMPARE(m->mList->getWidgetItem(0)->mapTo(m->mList, QPoint()).x(), 26 + 32 + 1);
+    m->m_list->setMargins(1, 20, 3, 40);
+    m->m_list->setSpacingBetweenItems(10);
+    QCOMPARE(m->m_list->widget()->height(), 20 + 40 + 300 + 20);
+    QCOMPARE(m->m_list->getWidgetItem(2)->y(), 20 + 2 * 110);
+    m->m_list->setSpacingBetweenItemAndScrollbar(26);
+    QCOMPARE(m->m_list->getSpacingBetweenItemAndScrollbar(), 26);
+    QCOMPARE(m->m_list->getWidgetItem(0)->mapTo(m->m_list, QPoint()).x(), 26 + 32 + 1);
 }
 
 void tst_ksscrollviewerwidget_layout::barShowsWhenNeeded()
 {
     m->fill(3);
-    KSScrollBar* bar = m->mList->getVScrollBar();
+    KSScrollBar* bar = m->m_list->getVScrollBar();
     QVERIFY(!bar->isVisible());
-    m->mList->setScrollBarAutoShow(false);
+    m->m_list->setScrollBarAutoShow(false);
     QVERIFY(bar->isVisible());
-    m->mList->setScrollBarAutoShow(true);
+    m->m_list->setScrollBarAutoShow(true);
     QVERIFY(!bar->isVisible());
     m->fill(3);
     QVERIFY(bar->isVisible());
@@ -241,32 +241,32 @@ void tst_ksscrollviewerwidget_layout::barShowsWhenNeeded()
 void tst_ksscrollviewerwidget_layout::barSides()
 {
     m->fill(10);
-    KSScrollBar* bar = m->mList->getVScrollBar();
-    const QWidget* row = m->mList->getWidgetItem(0);
-    QCOMPARE(m->mList->getVScrollBarAlignment(), Qt::Alignment(Qt::AlignLeft));
+    KSScrollBar* bar = m->m_list->getVScrollBar();
+    const QWidget* row = m->m_list->getWidgetItem(0);
+    QCOMPARE(m->m_list->getVScrollBarAlignment(), Qt::Alignment(Qt::AlignLeft));
     QCOMPARE(bar->pos(), QPoint(0, 0));
     QCOMPARE(bar->size(), QSize(32, ScrollViewerFixture::HEIGHT));
-    QCOMPARE(row->mapTo(m->mList, QPoint()), QPoint(38, 0));
-    m->mList->setVScrollBarAlignment(Qt::AlignRight);
+    QCOMPARE(row->mapTo(m->m_list, QPoint()), QPoint(38, 0));
+    m->m_list->setVScrollBarAlignment(Qt::AlignRight);
     QCOMPARE(bar->pos(), QPoint(ScrollViewerFixture::WIDTH - 32, 0));
-    QCOMPARE(row->mapTo(m->mList, QPoint()), QPoint(0, 0));
-    m->mList->setVScrollBarAlignment(Qt::AlignTop);
-    QCOMPARE(m->mList->getVScrollBarAlignment(), Qt::Alignment(Qt::AlignRight));
-    m->mList->setSize(300, 300);
+    QCOMPARE(row->mapTo(m->m_list, QPoint()), QPoint(0, 0));
+    m->m_list->setVScrollBarAlignment(Qt::AlignTop);
+    QCOMPARE(m->m_list->getVScrollBarAlignment(), Qt::Alignment(Qt::AlignRight));
+    m->m_list->setSize(300, 300);
     QCOMPARE(bar->pos(), QPoint(300 - 32, 0));
 }
 
 void tst_ksscrollviewerwidget_layout::barsGoTogether()
 {
     m->fill(20);
-    m->mList->getVScrollBar()->setValue(300);
+    m->m_list->getVScrollBar()->setValue(300);
     QCOMPARE(m->value(), 300);
-    m->mList->verticalScrollBar()->setValue(500);
-    QCOMPARE(m->mList->getVScrollBar()->value(), 500);
-    m->mList->slotSetScrollBarValue(1000000);
+    m->m_list->verticalScrollBar()->setValue(500);
+    QCOMPARE(m->m_list->getVScrollBar()->value(), 500);
+    m->m_list->slotSetScrollBarValue(1000000);
     QCOMPARE(m->value(), m->maximum());
-    m->mList->slotSetScrollBarValue(-5);
-    QCOMPARE(m->mList->getVScrollBar()->value(), 0);
+    m->m_list->slotSetScrollBarValue(-5);
+    QCOMPARE(m->m_list->getVScrollBar()->value(), 0);
 }
 
 // What is moved on the screen must be what a full painting gives.
@@ -274,26 +274,26 @@ void tst_ksscrollviewerwidget_layout::barsGoTogether()
 void tst_ksscrollviewerwidget_layout::barStaysInItsPlace()
 {
     m->fill(20);
-    const QRect place = m->mList->getVScrollBar()->geometry();
-    const auto scroll = [this](int value) { m->mList->slotSetScrollBarValue(value); };
+    const QRect place = m->m_list->getVScrollBar()->geometry();
+    const auto scroll = [this](int value) { m->m_list->slotSetScrollBarValue(value); };
     scroll(m->maximum());
-    QCOMPARE(m->mList->getVScrollBar()->geometry(), place);
-    m->mWindow.hide();
+    QCOMPARE(m->m_list->getVScrollBar()->geometry(), place);
+    m->m_window.hide();
     scroll(0);
     scroll(300);
-    QCOMPARE(m->mList->getVScrollBar()->geometry(), place);
-    m->mWindow.show();
-    QVERIFY(QTest::qWaitForWindowExposed(&m->mWindow, PATIENCE_MS));
-    QCOMPARE(m->mList->getVScrollBar()->geometry(), place);
-    m->mList->setUpdatesEnabled(false);
+    QCOMPARE(m->m_list->getVScrollBar()->geometry(), place);
+    m->m_window.show();
+    QVERIFY(QTest::qWaitForWindowExposed(&m->m_window, PATIENCE_MS));
+    QCOMPARE(m->m_list->getVScrollBar()->geometry(), place);
+    m->m_list->setUpdatesEnabled(false);
     scroll(m->maximum());
-    m->mList->setUpdatesEnabled(true);
-    QCOMPARE(m->mList->getVScrollBar()->geometry(), place);
+    m->m_list->setUpdatesEnabled(true);
+    QCOMPARE(m->m_list->getVScrollBar()->geometry(), place);
 }
 
 void tst_ksscrollviewerwidget_layout::scrolledIsWhatWouldBePainted()
 {
-    QWidget above(&m->mWindow); // floats over a part of the list, as a lifted row does
+    QWidget above(&m->m_window); // floats over a part of the list, as a lifted row does
     above.setGeometry(300, 250, 120, 60);
     above.setStyleSheet(QStringLiteral("background: rgb(200, 0, 0)"));
     above.hide();
@@ -301,20 +301,22 @@ void tst_ksscrollviewerwidget_layout::scrolledIsWhatWouldBePainted()
         auto* row = new Row(QString::number(i));
         row->setStyleSheet(QStringLiteral("QPushButton { background: rgb(%1, 80, 40) }").arg(10 * i + 40));
         row->setText(QString::number(i));
-        m->mList->addWidgetItem(row, -1);
+        m->m_list->addWidgetItem(row, -1);
     }
     const auto onScreen = [this] {
-        return m->mWindow.screen()
-            ->grabWindow(m->mWindow.winId())
+        return m->m_window.screen()
+            ->grabWindow(m->m_window.winId())
             .toImage()
             .convertToFormat(QImage::Format_RGB32);
     };
-    const auto painted = [this] { return m->mWindow.grab().toImage().convertToFormat(QImage::Format_RGB32); };
+    const auto painted = [this] {
+        return m->m_window.grab().toImage().convertToFormat(QImage::Format_RGB32);
+    };
     for (const bool covered : {false, true}) {
         above.setVisible(covered);
         above.raise();
         for (const int value : {0, 24, 130, 131, 900, 876, 1500, 20, 0}) {
-            m->mList->slotSetScrollBarValue(value);
+            m->m_list->slotSetScrollBarValue(value);
             QCOMPARE(m->value(), value);
             QTRY_VERIFY2(onScreen() == painted(), qPrintable(QString::number(value)));
             QVERIFY(!onScreen().isNull());
@@ -337,65 +339,66 @@ void tst_ksscrollviewerwidget_layout::moving()
 {
     QFETCH(int, index);
     m->fill(20);
-    m->mList->slotSetScrollBarValue(77);
-    m->mList->moveToWidgetItem(index);
+    m->m_list->slotSetScrollBarValue(77);
+    m->m_list->moveToWidgetItem(index);
     QTEST(m->value(), "value");
 }
 
 void tst_ksscrollviewerwidget_layout::lastVisible()
 {
     m->fill(20);
-    m->mList->setLastVisibleItem(10);
+    m->m_list->setLastVisibleItem(10);
     QCOMPARE(m->value(), 10 * ScrollViewerFixture::ROW + 100 - ScrollViewerFixture::HEIGHT);
-    m->mList->setLastVisibleItem(m->mList->getWidgetItem(1));
+    m->m_list->setLastVisibleItem(m->m_list->getWidgetItem(1));
     QCOMPARE(m->value(), 0);
-    m->mList->setLastVisibleItem(20);
-    m->mList->setLastVisibleItem(nullptr);
+    m->m_list->setLastVisibleItem(20);
+    m->m_list->setLastVisibleItem(nullptr);
     QCOMPARE(m->value(), 0);
 }
 
 void tst_ksscrollviewerwidget_layout::visibleRange()
 {
     m->fill(20);
-    QSignalSpy changes(m->mList, &KSScrollViewerWidget::signalVisibleItemsChange);
-    QCOMPARE(m->mList->firstVisibleItem(), 0);
-    QCOMPARE(m->mList->lastVisibleItem(), 4);
-    m->mList->slotSetScrollBarValue(10);
+    QSignalSpy changes(m->m_list, &KSScrollViewerWidget::signalVisibleItemsChange);
+    QCOMPARE(m->m_list->firstVisibleItem(), 0);
+    QCOMPARE(m->m_list->lastVisibleItem(), 4);
+    m->m_list->slotSetScrollBarValue(10);
     QCOMPARE(changes.count(), 0);
-    m->mList->slotSetScrollBarValue(100); // the gap below the first row is left of it
+    m->m_list->slotSetScrollBarValue(100); // the gap below the first row is left of it
     QCOMPARE(changes.count(), 1);
-    QCOMPARE(m->mList->firstVisibleItem(), 1);
-    QCOMPARE(m->mList->lastVisibleItem(), 5);
-    QCOMPARE(m->mList->calculateVisibleRect(), QRect(-38, 100, 400, 500));
+    QCOMPARE(m->m_list->firstVisibleItem(), 1);
+    QCOMPARE(m->m_list->lastVisibleItem(), 5);
+    QCOMPARE(m->m_list->calculateVisibleRect(), QRect(-38, 100, 400, 500));
 }
 
 void tst_ksscrollviewerwidget_layout::finding()
 {
     m->fill(20);
-    m->mList->slotSetScrollBarValue(ScrollViewerFixture::ROW);
-    QCOMPARE(m->mList->getWidgetItem(QPoint(100, 10)), m->mList->getWidgetItem(1));
-    QVERIFY(!m->mList->getWidgetItem(QPoint(100, 101)));
-    QVERIFY(!m->mList->getWidgetItem(QPoint(10, 10)));
-    QCOMPARE(m->mList->getWidgetItems(QRect(100, 0, 10, 150)).size(), 2);
-    QCOMPARE(m->mList->getItemsIntersectRect(QRect(0, 0, 10, 150)).constFirst(), m->mList->getWidgetItem(0));
-    QCOMPARE(m->mList->getWidgetItems(18, 5).size(), 2);
-    QVERIFY(m->mList->getWidgetItems(-3, 5).isEmpty());
-    QVERIFY(m->mList->getWidgetItems(3, -5).isEmpty());
+    m->m_list->slotSetScrollBarValue(ScrollViewerFixture::ROW);
+    QCOMPARE(m->m_list->getWidgetItem(QPoint(100, 10)), m->m_list->getWidgetItem(1));
+    QVERIFY(!m->m_list->getWidgetItem(QPoint(100, 101)));
+    QVERIFY(!m->m_list->getWidgetItem(QPoint(10, 10)));
+    QCOMPARE(m->m_list->getWidgetItems(QRect(100, 0, 10, 150)).size(), 2);
+    QCOMPARE(m->m_list->getItemsIntersectRect(QRect(0, 0, 10, 150)).constFirst(),
+             m->m_list->getWidgetItem(0));
+    QCOMPARE(m->m_list->getWidgetItems(18, 5).size(), 2);
+    QVERIFY(m->m_list->getWidgetItems(-3, 5).isEmpty());
+    QVERIFY(m->m_list->getWidgetItems(3, -5).isEmpty());
 }
 
 void tst_ksscrollviewerwidget_layout::insertPlaces()
 {
     m->fill(3);
-    QCOMPARE(m->mList->getInsertPos(QPoint(100, 10)), 0);
-    QCOMPARE(m->mList->getInsertPos(QPoint(100, 60)), 1);
-    QCOMPARE(m->mList->getInsertPos(QPoint(100, 160)), 2);
-    QCOMPARE(m->mList->getInsertPos(QPoint(100, 499)), 3);
+    QCOMPARE(m->m_list->getInsertPos(QPoint(100, 10)), 0);
+    QCOMPARE(m->m_list->getInsertPos(QPoint(100, 60)), 1);
+    QCOMPARE(m->m_list->getInsertPos(QPoint(100, 160)), 2);
+    QCOMPARE(m->m_list->getInsertPos(QPoint(100, 499)), 3);
 }
 
 void tst_ksscrollviewerwidget_layout::wheelGoesByRows()
 {
     m->fill(20);
-    QSignalSpy changes(m->mList, &KSScrollViewerWidget::signalVisibleItemsChange);
+    QSignalSpy changes(m->m_list, &KSScrollViewerWidget::signalVisibleItemsChange);
     wheel(-120);
     QCOMPARE(m->value(), ScrollViewerFixture::ROW);
     wheel(-120);
@@ -413,12 +416,12 @@ void tst_ksscrollviewerwidget_layout::wheelGoesByRows()
 void tst_ksscrollviewerwidget_layout::wheelAtTheLowerEnd()
 {
     m->fill(20);
-    m->mList->slotSetScrollBarValue(m->maximum());
-    const int first = m->mList->firstVisibleItem();
+    m->m_list->slotSetScrollBarValue(m->maximum());
+    const int first = m->m_list->firstVisibleItem();
     wheel(-120);
     QCOMPARE(m->value(), m->maximum());
     // The row that is cut above comes in whole, no further.
-    QVERIFY(m->mList->getWidgetItem(first)->mapTo(m->mList, QPoint()).y() < 0);
+    QVERIFY(m->m_list->getWidgetItem(first)->mapTo(m->m_list, QPoint()).y() < 0);
     wheel(120);
     QCOMPARE(m->value(), first * ScrollViewerFixture::ROW);
 }
@@ -428,53 +431,53 @@ void tst_ksscrollviewerwidget_layout::keysAreEaten()
     m->fill(20);
     for (int key :
          {Qt::Key_Down, Qt::Key_Right, Qt::Key_PageDown, Qt::Key_Up, Qt::Key_Left, Qt::Key_PageUp}) {
-        QTest::keyClick(m->mList, static_cast<Qt::Key>(key));
+        QTest::keyClick(m->m_list, static_cast<Qt::Key>(key));
         QCOMPARE(m->value(), 0);
     }
 }
 
 void tst_ksscrollviewerwidget_layout::separators()
 {
-    const auto gap = [this] { return m->mWindow.grab().toImage().pixelColor(100 + 200, 100 + 102); };
+    const auto gap = [this] { return m->m_window.grab().toImage().pixelColor(100 + 200, 100 + 102); };
     m->fill(3);
     const QColor line = gap();
     QVERIFY(line != QColor(51, 51, 51));
-    QCOMPARE(m->mWindow.grab().toImage().pixelColor(300, 100 + 2 * ScrollViewerFixture::ROW + 102),
+    QCOMPARE(m->m_window.grab().toImage().pixelColor(300, 100 + 2 * ScrollViewerFixture::ROW + 102),
              QColor(51, 51, 51)); // none below the last one
-    m->mList->setHasSeparator(false);
-    QVERIFY(!m->mList->getHasSeparator());
+    m->m_list->setHasSeparator(false);
+    QVERIFY(!m->m_list->getHasSeparator());
     QCOMPARE(gap(), QColor(51, 51, 51));
 }
 
 void tst_ksscrollviewerwidget_layout::barStyleGrowsOnce()
 {
     const QString before = KSScrollViewerWidget::s_scrollBarStyle;
-    m->mList->slotChangeScrollBarStyle(0, 0);
+    m->m_list->slotChangeScrollBarStyle(0, 0);
     const QString once = KSScrollViewerWidget::s_scrollBarStyle;
     QVERIFY(once.startsWith(before) && once.endsWith(QStringLiteral("width: 20px}")));
-    m->mList->slotChangeScrollBarStyle(3, 3);
+    m->m_list->slotChangeScrollBarStyle(3, 3);
     QCOMPARE(KSScrollViewerWidget::s_scrollBarStyle, once);
-    m->mList->slotChangeScrollBarStyle(0, 9);
+    m->m_list->slotChangeScrollBarStyle(0, 9);
     QVERIFY(KSScrollViewerWidget::s_scrollBarStyle.endsWith(QStringLiteral("width: 14px}")));
     KSScrollViewerWidget::s_scrollBarStyle = before;
 }
 
 void tst_ksscrollviewerwidget_layout::minitrimStatus()
 {
-    QVERIFY(m->mList->setMinitrimStatus(false));
-    QVERIFY(!m->mList->setMinitrimStatus(true));
+    QVERIFY(m->m_list->setMinitrimStatus(false));
+    QVERIFY(!m->m_list->setMinitrimStatus(true));
 }
 
 void tst_ksscrollviewerwidget_layout::outlivesItsRows()
 {
     m->fill(10);
-    QPointer<KSBaseItemWidget> row = m->mList->getWidgetItem(3);
+    QPointer<KSBaseItemWidget> row = m->m_list->getWidgetItem(3);
     delete row;
-    QCOMPARE(m->mList->count(), 9);
-    QCOMPARE(m->mList->getWidgetItem(3)->objectName(), QStringLiteral("4"));
-    QTRY_COMPARE(m->mList->getWidgetItem(3)->y(), 3 * ScrollViewerFixture::ROW);
-    row = m->mList->getWidgetItem(0);
-    delete m->mList;
+    QCOMPARE(m->m_list->count(), 9);
+    QCOMPARE(m->m_list->getWidgetItem(3)->objectName(), QStringLiteral("4"));
+    QTRY_COMPARE(m->m_list->getWidgetItem(3)->y(), 3 * ScrollViewerFixture::ROW);
+    row = m->m_list->getWidgetItem(0);
+    delete m->m_list;
     QVERIFY(!row);
 }
 
@@ -596,9 +599,9 @@ void tst_ksscrollviewerwidget_layout::styles()
 void tst_ksscrollviewerwidget_layout::rowLosesItsFocus()
 {
     m->fill(5);
-    QSignalSpy lost(m->mList->getWidgetItem(1), &KSBaseItemWidget::signalLostFocus);
+    QSignalSpy lost(m->m_list->getWidgetItem(1), &KSBaseItemWidget::signalLostFocus);
     m->tap(100, 150);
-    QVERIFY(m->mList->getWidgetItem(1)->hasFocusFlag());
+    QVERIFY(m->m_list->getWidgetItem(1)->hasFocusFlag());
     m->tap(100, 150);
     QCOMPARE(lost.count(), 0);
     m->tap(100, 50);
@@ -606,21 +609,21 @@ void tst_ksscrollviewerwidget_layout::rowLosesItsFocus()
     m->tap(100, 50);
     QCOMPARE(lost.count(), 1);
     m->tap(100, 150);
-    m->mList->getWidgetItem(1)->setPopup(true);
+    m->m_list->getWidgetItem(1)->setPopup(true);
     m->tap(100, 50);
     QCOMPARE(lost.count(), 1);
-    m->mList->getWidgetItem(1)->setPopup(false);
-    QTest::mouseClick(&m->mWindow, Qt::LeftButton, Qt::NoModifier, QPoint(10, 10));
+    m->m_list->getWidgetItem(1)->setPopup(false);
+    QTest::mouseClick(&m->m_window, Qt::LeftButton, Qt::NoModifier, QPoint(10, 10));
     QCOMPARE(lost.count(), 2);
 }
 
 void tst_ksscrollviewerwidget_layout::mousePassesThrough()
 {
     m->fill(5);
-    QSignalSpy clicked(m->mList->getWidgetItem(1), &QAbstractButton::clicked);
-    QTest::mouseClick(m->mList->getWidgetItem(1), Qt::LeftButton);
+    QSignalSpy clicked(m->m_list->getWidgetItem(1), &QAbstractButton::clicked);
+    QTest::mouseClick(m->m_list->getWidgetItem(1), Qt::LeftButton);
     QCOMPARE(m->takeLog(), (Names{"pressed 1", "released 1", "clicked 1"}));
-    QTest::mouseDClick(m->mList->getWidgetItem(1), Qt::LeftButton);
+    QTest::mouseDClick(m->m_list->getWidgetItem(1), Qt::LeftButton);
     m->clock.advance(2000);
     QCOMPARE(clicked.count(), 0);
 }
@@ -655,7 +658,7 @@ void tst_ksscrollviewerwidget_layout::barPictures()
 void tst_ksscrollviewerwidget_layout::barSwallows()
 {
     m->fill(20);
-    KSScrollBar* bar = m->mList->getVScrollBar();
+    KSScrollBar* bar = m->m_list->getVScrollBar();
     QContextMenuEvent menu(QContextMenuEvent::Mouse, QPoint(5, 5), bar->mapToGlobal(QPoint(5, 5)));
     QVERIFY(QCoreApplication::sendEvent(bar, &menu));
     QWheelEvent event(QPoint(5, 5), bar->mapToGlobal(QPoint(5, 5)), QPoint(), QPoint(0, -120), Qt::NoButton,

@@ -32,10 +32,10 @@ private Q_SLOTS:
 void tst_ksscrollviewerwidget_move::liftAndDrop()
 {
     lift(1);
-    const KSBaseItemWidget* clone = m->mList->getMoveItem();
+    const KSBaseItemWidget* clone = m->m_list->getMoveItem();
     QVERIFY(clone && clone->isPopup() && clone->isVisible());
-    QCOMPARE(clone->parentWidget(), &m->mWindow);
-    QCOMPARE(QWidget::mouseGrabber(), m->mList->viewport());
+    QCOMPARE(clone->parentWidget(), &m->m_window);
+    QCOMPARE(QWidget::mouseGrabber(), m->m_list->viewport());
     const int x = clone->x();
     for (int y = 154; y <= 360; y += 10)
         m->move(70, y);
@@ -44,13 +44,13 @@ void tst_ksscrollviewerwidget_move::liftAndDrop()
     m->release(70, 360);
     QCOMPARE(m->takeLog().filter("dropped").size(), 1);
     QCOMPARE(m->order().mid(0, 6), (Names{"0", "2", "3", "1", "4", "5"}));
-    QVERIFY(!m->mList->isDragging());
-    QVERIFY(!m->mList->getMoveItem());
+    QVERIFY(!m->m_list->isDragging());
+    QVERIFY(!m->m_list->getMoveItem());
     QVERIFY(!QWidget::mouseGrabber());
-    QVERIFY(m->mList->getWidgetItem(3)->isVisible());
-    QVERIFY(!m->mList->getWidgetItem(3)->isPopup());
-    QVERIFY(m->mList->getWidgetItem(3)->hasDragFlag());
-    QCOMPARE(m->mList->getWidgetItem(3)->y(), 3 * ScrollViewerFixture::ROW);
+    QVERIFY(m->m_list->getWidgetItem(3)->isVisible());
+    QVERIFY(!m->m_list->getWidgetItem(3)->isPopup());
+    QVERIFY(m->m_list->getWidgetItem(3)->hasDragFlag());
+    QCOMPARE(m->m_list->getWidgetItem(3)->y(), 3 * ScrollViewerFixture::ROW);
     QVERIFY(clone->isHidden());
     QCOMPARE(m->clock.running(), 0);
     m->takeLog();
@@ -60,9 +60,9 @@ void tst_ksscrollviewerwidget_move::liftAndDrop()
 
 void tst_ksscrollviewerwidget_move::dropAtTheEnd()
 {
-    m->mList->setItemsDragFlagAlignment(DRAGFLAG_LEFT);
+    m->m_list->setItemsDragFlagAlignment(DRAGFLAG_LEFT);
     m->fill(4);
-    m->mList->slotItemsCanDrag(true);
+    m->m_list->slotItemsCanDrag(true);
     m->press(50, 50);
     m->clock.advance(50);
     m->move(50, 100);
@@ -118,8 +118,8 @@ void tst_ksscrollviewerwidget_move::edgeScrollingFasterFarOut()
     lift(2);
     const int height = ScrollViewerFixture::HEIGHT;
     const auto hang = [&](int overhang) { // by so much
-        const KSBaseItemWidget* clone = m->mList->getMoveItem();
-        const int bottom = clone->mapTo(&m->mWindow, QPoint(0, clone->height())).y() - m->mList->y();
+        const KSBaseItemWidget* clone = m->m_list->getMoveItem();
+        const int bottom = clone->mapTo(&m->m_window, QPoint(0, clone->height())).y() - m->m_list->y();
         static int finger = 258;
         finger += overhang - (bottom - height);
         m->move(50, finger);
@@ -157,25 +157,25 @@ void tst_ksscrollviewerwidget_move::cloneJumpsAside()
 {
     lift(1);
     // 20 to the left and 20 down of where the row was, for a handle on the left.
-    QCOMPARE(m->mList->getMoveItem()->pos(), QPoint(100 + 38 - 20, 100 + ScrollViewerFixture::ROW + 20));
+    QCOMPARE(m->m_list->getMoveItem()->pos(), QPoint(100 + 38 - 20, 100 + ScrollViewerFixture::ROW + 20));
     m->release(50, 154);
-    for (int i = 0; i < m->mList->count(); ++i)
-        m->mList->getWidgetItem(i)->setDragFlagAlignment(DRAGFLAG_RIGHT);
+    for (int i = 0; i < m->m_list->count(); ++i)
+        m->m_list->getWidgetItem(i)->setDragFlagAlignment(DRAGFLAG_RIGHT);
     m->press(390, 154);
     m->clock.advance(50);
-    QCOMPARE(m->mList->getMoveItem()->pos(), QPoint(100 + 38 + 20, 100 + ScrollViewerFixture::ROW + 20));
+    QCOMPARE(m->m_list->getMoveItem()->pos(), QPoint(100 + 38 + 20, 100 + ScrollViewerFixture::ROW + 20));
     m->release(390, 154);
 }
 
 void tst_ksscrollviewerwidget_move::rowWithoutCloneFloatsItself()
 {
-    m->mList->setItemsDragFlagAlignment(DRAGFLAG_LEFT);
+    m->m_list->setItemsDragFlagAlignment(DRAGFLAG_LEFT);
     m->fill(5, false);
-    m->mList->slotItemsCanDrag(true);
-    KSBaseItemWidget* row = m->mList->getWidgetItem(1);
+    m->m_list->slotItemsCanDrag(true);
+    KSBaseItemWidget* row = m->m_list->getWidgetItem(1);
     m->press(50, 154);
     m->clock.advance(50);
-    QCOMPARE(m->mList->getMoveItem(), row);
+    QCOMPARE(m->m_list->getMoveItem(), row);
     QVERIFY(row->isVisible());
     m->move(50, 200);
     m->move(50, 364);
@@ -185,35 +185,35 @@ void tst_ksscrollviewerwidget_move::rowWithoutCloneFloatsItself()
     m->press(50, 50);
     m->clock.advance(50);
     m->release(50, 50);
-    QCOMPARE(m->mList->getWidgetItem(3), row);
+    QCOMPARE(m->m_list->getWidgetItem(3), row);
 }
 
 void tst_ksscrollviewerwidget_move::handleReleasedEarlyIsATap()
 {
-    m->mList->setItemsDragFlagAlignment(DRAGFLAG_RIGHT);
+    m->m_list->setItemsDragFlagAlignment(DRAGFLAG_RIGHT);
     m->fill(5);
-    m->mList->slotItemsCanDrag(true);
+    m->m_list->slotItemsCanDrag(true);
     m->press(390, 154);
     m->clock.advance(49);
     m->release(390, 154);
     m->clock.advance(100);
     QCOMPARE(m->takeLog(), (Names{"released 1", "clicked 1"}));
-    QVERIFY(!m->mList->isDragging());
+    QVERIFY(!m->m_list->isDragging());
 }
 
 void tst_ksscrollviewerwidget_move::pressBesideTheHandleLiftsNothing()
 {
-    m->mList->setItemsDragFlagAlignment(DRAGFLAG_LEFT);
+    m->m_list->setItemsDragFlagAlignment(DRAGFLAG_LEFT);
     m->fill(5);
-    m->mList->slotItemsCanDrag(true);
+    m->m_list->slotItemsCanDrag(true);
     m->press(38 + 36, 154);
     m->clock.advance(100);
-    QVERIFY(!m->mList->isDragging());
+    QVERIFY(!m->m_list->isDragging());
     m->release(38 + 36, 154);
-    m->mList->slotItemsCanDrag(false);
+    m->m_list->slotItemsCanDrag(false);
     m->press(50, 154);
     m->clock.advance(100);
-    QVERIFY(!m->mList->isDragging());
+    QVERIFY(!m->m_list->isDragging());
     m->release(50, 154);
 }
 
@@ -222,7 +222,7 @@ void tst_ksscrollviewerwidget_move::startMoveOfTheRowLifts()
     m->fill(5);
     m->press(200, 154);
     m->takeLog();
-    KSBaseItemWidget* row = m->mList->getWidgetItem(1);
+    KSBaseItemWidget* row = m->m_list->getWidgetItem(1);
     Q_EMIT row->signalStartMove(row);
     QCOMPARE(m->takeLog(), Names{"lifted 1"});
     m->clock.advance(800); // no hold
@@ -239,11 +239,11 @@ void tst_ksscrollviewerwidget_move::switchingOffDropsTheRow()
     lift(1);
     m->move(50, 160);
     m->move(50, 260);
-    m->mList->slotItemsCanDrag(false);
-    QVERIFY(!m->mList->isDragging());
-    QCOMPARE(m->mList->count(), 20);
+    m->m_list->slotItemsCanDrag(false);
+    QVERIFY(!m->m_list->isDragging());
+    QCOMPARE(m->m_list->count(), 20);
     for (int i = 0; i < 20; ++i)
-        QVERIFY(!m->mList->getWidgetItem(i)->hasDragFlag());
+        QVERIFY(!m->m_list->getWidgetItem(i)->hasDragFlag());
     QCOMPARE(m->takeLog(), Names{"dropped"});
     m->release(50, 260);
     QCOMPARE(m->takeLog(), Names());
@@ -253,25 +253,25 @@ void tst_ksscrollviewerwidget_move::othersAreDeafWhileDragging()
 {
     lift(1);
     // Past the application's filter, which would refuse it for itself.
-    QCoreApplication::instance()->removeEventFilter(&m->mFilter);
-    auto other = QTest::touchEvent(&m->mWindow, m_other, false);
-    other.press(1, QPoint(200, 450), m->mList).commit();
-    other.move(1, QPoint(200, 200), m->mList).commit();
-    other.release(1, QPoint(200, 200), m->mList).commit();
-    QCoreApplication::instance()->installEventFilter(&m->mFilter);
+    QCoreApplication::instance()->removeEventFilter(&m->m_filter);
+    auto other = QTest::touchEvent(&m->m_window, m_other, false);
+    other.press(1, QPoint(200, 450), m->m_list).commit();
+    other.move(1, QPoint(200, 200), m->m_list).commit();
+    other.release(1, QPoint(200, 200), m->m_list).commit();
+    QCoreApplication::instance()->installEventFilter(&m->m_filter);
     QCOMPARE(m->takeLog(), Names());
-    QVERIFY(m->mList->isDragging());
+    QVERIFY(m->m_list->isDragging());
     m->release(50, 154);
 }
 
 void tst_ksscrollviewerwidget_move::addingWhileDraggingKeepsThePlace()
 {
     lift(1);
-    m->mList->addWidgetItem(new Row(QStringLiteral("new")), 0);
-    m->mList->removeWidgetItem(m->mList->getWidgetItem(19));
-    QVERIFY(m->mList->isDragging());
+    m->m_list->addWidgetItem(new Row(QStringLiteral("new")), 0);
+    m->m_list->removeWidgetItem(m->m_list->getWidgetItem(19));
+    QVERIFY(m->m_list->isDragging());
     m->release(50, 154);
-    QCOMPARE(m->mList->count(), 20);
+    QCOMPARE(m->m_list->count(), 20);
     QVERIFY(m->order().contains(QStringLiteral("1")));
     QVERIFY(m->order().contains(QStringLiteral("new")));
 }
@@ -279,18 +279,18 @@ void tst_ksscrollviewerwidget_move::addingWhileDraggingKeepsThePlace()
 void tst_ksscrollviewerwidget_move::removingTheLiftedRow()
 {
     lift(1);
-    KSBaseItemWidget* row = m->mList->getMoveItem();
+    KSBaseItemWidget* row = m->m_list->getMoveItem();
     QVERIFY(row);
-    KSBaseItemWidget* lifted = m->mList->getSelectedItem();
-    m->mList->removeWidgetItem(lifted);
-    QVERIFY(!m->mList->isDragging());
+    KSBaseItemWidget* lifted = m->m_list->getSelectedItem();
+    m->m_list->removeWidgetItem(lifted);
+    QVERIFY(!m->m_list->isDragging());
     QVERIFY(lifted->isHidden());
-    QCOMPARE(m->mList->count(), 19);
+    QCOMPARE(m->m_list->count(), 19);
     QVERIFY(!QWidget::mouseGrabber());
     m->move(50, 300);
     m->release(50, 300);
     QCOMPARE(m->takeLog(), Names());
-    m->mList->addWidgetItem(lifted, 1);
+    m->m_list->addWidgetItem(lifted, 1);
     QCOMPARE(m->order().mid(0, 3), (Names{"0", "1", "2"}));
     QVERIFY(lifted->isVisible());
 }
@@ -298,9 +298,9 @@ void tst_ksscrollviewerwidget_move::removingTheLiftedRow()
 void tst_ksscrollviewerwidget_move::clearingWhileDragging()
 {
     lift(1);
-    m->mList->removeAll();
-    QVERIFY(m->mList->isEmpty());
-    QVERIFY(!m->mList->isDragging());
+    m->m_list->removeAll();
+    QVERIFY(m->m_list->isEmpty());
+    QVERIFY(!m->m_list->isDragging());
     m->move(50, 300);
     m->release(50, 300);
     QCOMPARE(m->maximum(), 0);
@@ -313,28 +313,28 @@ void tst_ksscrollviewerwidget_move::clearingWhileDragging()
 void tst_ksscrollviewerwidget_move::deletedWhileDragging()
 {
     lift(1);
-    delete m->mList->getSelectedItem();
-    delete m->mList->getWidgetItem(0);
-    QCOMPARE(m->mList->count(), 18);
+    delete m->m_list->getSelectedItem();
+    delete m->m_list->getWidgetItem(0);
+    QCOMPARE(m->m_list->count(), 18);
     m->move(50, 200);
     m->clock.advance(100);
     m->release(50, 200);
-    QVERIFY(!m->mList->isDragging());
-    QVERIFY(!m->mList->getMoveItem());
-    QCOMPARE(m->mList->count(), 18);
-    QCOMPARE(m->mList->getWidgetItem(0)->y(), 0);
-    QVERIFY(!m->mFilter.isLock(nullptr, LOCKMETHOD_TOUCH));
+    QVERIFY(!m->m_list->isDragging());
+    QVERIFY(!m->m_list->getMoveItem());
+    QCOMPARE(m->m_list->count(), 18);
+    QCOMPARE(m->m_list->getWidgetItem(0)->y(), 0);
+    QVERIFY(!m->m_filter.isLock(nullptr, LOCKMETHOD_TOUCH));
 }
 
 void tst_ksscrollviewerwidget_move::mouseLiftsAndDrops()
 {
-    m->mList->setItemsDragFlagAlignment(DRAGFLAG_LEFT);
+    m->m_list->setItemsDragFlagAlignment(DRAGFLAG_LEFT);
     m->fill(5);
-    m->mList->slotItemsCanDrag(true);
-    QWidget* viewport = m->mList->viewport();
-    QTest::mousePress(m->mList->getWidgetItem(1), Qt::LeftButton, Qt::NoModifier, QPoint(12, 50));
+    m->m_list->slotItemsCanDrag(true);
+    QWidget* viewport = m->m_list->viewport();
+    QTest::mousePress(m->m_list->getWidgetItem(1), Qt::LeftButton, Qt::NoModifier, QPoint(12, 50));
     m->clock.advance(50);
-    QVERIFY(m->mList->isDragging());
+    QVERIFY(m->m_list->isDragging());
     QTest::mouseMove(viewport, QPoint(50, 200));
     QTest::mouseMove(viewport, QPoint(50, 364));
     QTest::mouseRelease(viewport, Qt::LeftButton, Qt::NoModifier, QPoint(50, 364));

@@ -61,72 +61,72 @@ class tst_onefinger : public QObject
 private Q_SLOTS:
     void init()
     {
-        mTouch = std::make_unique<TouchFixture>();
-        mPad = std::make_unique<Pad>();
-        mPad->show();
-        QVERIFY(QTest::qWaitForWindowExposed(mPad.get(), PATIENCE_MS));
-        mCancelled = std::make_unique<QSignalSpy>(&mPad->finger, &OneFinger::cancelled);
+        m_touch = std::make_unique<TouchFixture>();
+        m_pad = std::make_unique<Pad>();
+        m_pad->show();
+        QVERIFY(QTest::qWaitForWindowExposed(m_pad.get(), PATIENCE_MS));
+        m_cancelled = std::make_unique<QSignalSpy>(&m_pad->finger, &OneFinger::cancelled);
     }
     void cleanup()
     {
-        mPad.reset();
-        mTouch.reset();
+        m_pad.reset();
+        m_touch.reset();
     }
 
     void aTouch()
     {
-        mTouch->press(mPad.get(), QPoint(20, 30));
-        QVERIFY(mPad->finger.isDown());
-        QCOMPARE(mPad->finger.receiver(), mPad.get());
-        mTouch->move(mPad.get(), QPoint(25, 35));
-        QCOMPARE(mPad->finger.positionIn(mPad.get()), QPointF(25, 35));
-        QCOMPARE(mPad->finger.pressPosition(), mPad->mapToGlobal(QPointF(20, 30)));
-        mTouch->lift(mPad.get(), QPoint(26, 36));
-        QVERIFY(!mPad->finger.isDown());
-        QCOMPARE(mPad->finger.id(), -1);
-        QVERIFY(!mPad->finger.receiver());
-        QCOMPARE(mPad->finger.positionIn(mPad.get()), QPointF(26, 36));
-        QCOMPARE(mPad->take(), (QList<Step>{Step::Begin, Step::Move, Step::End}));
-        QCOMPARE(mCancelled->count(), 0);
+        m_touch->press(m_pad.get(), QPoint(20, 30));
+        QVERIFY(m_pad->finger.isDown());
+        QCOMPARE(m_pad->finger.receiver(), m_pad.get());
+        m_touch->move(m_pad.get(), QPoint(25, 35));
+        QCOMPARE(m_pad->finger.positionIn(m_pad.get()), QPointF(25, 35));
+        QCOMPARE(m_pad->finger.pressPosition(), m_pad->mapToGlobal(QPointF(20, 30)));
+        m_touch->lift(m_pad.get(), QPoint(26, 36));
+        QVERIFY(!m_pad->finger.isDown());
+        QCOMPARE(m_pad->finger.id(), -1);
+        QVERIFY(!m_pad->finger.receiver());
+        QCOMPARE(m_pad->finger.positionIn(m_pad.get()), QPointF(26, 36));
+        QCOMPARE(m_pad->take(), (QList<Step>{Step::Begin, Step::Move, Step::End}));
+        QCOMPARE(m_cancelled->count(), 0);
     }
 
     void furtherFingersAreIgnored()
     {
-        auto fingers = QTest::touchEvent(mPad.get(), mTouch->device(), false);
+        auto fingers = QTest::touchEvent(m_pad.get(), m_touch->device(), false);
         fingers.press(0, QPoint(20, 30)).commit();
         fingers.stationary(0).press(1, QPoint(60, 30)).commit();
         fingers.move(0, QPoint(22, 30)).move(1, QPoint(80, 30)).commit();
-        QCOMPARE(mPad->finger.positionIn(mPad.get()), QPointF(22, 30));
+        QCOMPARE(m_pad->finger.positionIn(m_pad.get()), QPointF(22, 30));
         fingers.release(0, QPoint(22, 30)).stationary(1).commit();
-        QVERIFY(!mPad->finger.isDown());
+        QVERIFY(!m_pad->finger.isDown());
         fingers.move(1, QPoint(90, 30)).commit();
         fingers.release(1, QPoint(90, 30)).commit();
-        QCOMPARE(mPad->take(),
+        QCOMPARE(m_pad->take(),
                  (QList<Step>{Step::Begin, Step::Move, Step::Move, Step::End, Step::None, Step::None}));
     }
 
     void aBeginStartsAnew()
     {
-        mTouch->press(mPad.get(), QPoint(20, 30));
+        m_touch->press(m_pad.get(), QPoint(20, 30));
         QTouchEvent again(
-            QEvent::TouchBegin, mTouch->device(), Qt::NoModifier,
-            {QEventPoint(7, QEventPoint::Pressed, QPointF(40, 30), mPad->mapToGlobal(QPointF(40, 30)))});
-        QCoreApplication::sendEvent(mPad.get(), &again);
-        QCOMPARE(mCancelled->count(), 1);
-        QCOMPARE(mPad->finger.id(), 7);
-        QCOMPARE(mPad->finger.positionIn(mPad.get()), QPointF(40, 30));
-        QCOMPARE(mPad->take(), (QList<Step>{Step::Begin, Step::Begin}));
+            QEvent::TouchBegin, m_touch->device(), Qt::NoModifier,
+            {QEventPoint(7, QEventPoint::Pressed, QPointF(40, 30), m_pad->mapToGlobal(QPointF(40, 30)))});
+        QCoreApplication::sendEvent(m_pad.get(), &again);
+        QCOMPARE(m_cancelled->count(), 1);
+        QCOMPARE(m_pad->finger.id(), 7);
+        QCOMPARE(m_pad->finger.positionIn(m_pad.get()), QPointF(40, 30));
+        QCOMPARE(m_pad->take(), (QList<Step>{Step::Begin, Step::Begin}));
     }
 
     void anEndWithoutTheFingerCancels()
     {
-        mTouch->press(mPad.get(), QPoint(20, 30));
+        m_touch->press(m_pad.get(), QPoint(20, 30));
         QTouchEvent end(
-            QEvent::TouchEnd, mTouch->device(), Qt::NoModifier,
-            {QEventPoint(7, QEventPoint::Released, QPointF(40, 30), mPad->mapToGlobal(QPointF(40, 30)))});
-        QCoreApplication::sendEvent(mPad.get(), &end);
-        QCOMPARE(mCancelled->count(), 1);
-        QVERIFY(!mPad->finger.isDown());
+            QEvent::TouchEnd, m_touch->device(), Qt::NoModifier,
+            {QEventPoint(7, QEventPoint::Released, QPointF(40, 30), m_pad->mapToGlobal(QPointF(40, 30)))});
+        QCoreApplication::sendEvent(m_pad.get(), &end);
+        QCOMPARE(m_cancelled->count(), 1);
+        QVERIFY(!m_pad->finger.isDown());
     }
 
     void whatTakesTheFingerAway_data()
@@ -137,13 +137,13 @@ private Q_SLOTS:
             QTest::addRow("%s", name) << false << end;
             QTest::addRow("%s, on a child", name) << true << end;
         };
-        rows("an event", [this] { mTouch->cancel(qobject_cast<QWidget*>(mPad->finger.receiver())); });
-        rows("its owner", [this] { mPad->finger.cancel(); });
-        rows("hiding", [this] { mPad->hide(); });
-        rows("disabling", [this] { mPad->setEnabled(false); });
-        rows("an unlock", [this] { mTouch->filter->unlock(); });
+        rows("an event", [this] { m_touch->cancel(qobject_cast<QWidget*>(m_pad->finger.receiver())); });
+        rows("its owner", [this] { m_pad->finger.cancel(); });
+        rows("hiding", [this] { m_pad->hide(); });
+        rows("disabling", [this] { m_pad->setEnabled(false); });
+        rows("an unlock", [this] { m_touch->filter->unlock(); });
         QTest::newRow("destruction of the child")
-            << true << std::function<void()>([this] { delete std::exchange(mPad->child, nullptr); });
+            << true << std::function<void()>([this] { delete std::exchange(m_pad->child, nullptr); });
     }
 
     void whatTakesTheFingerAway()
@@ -151,88 +151,88 @@ private Q_SLOTS:
         QFETCH(bool, onTheChild);
         QFETCH(std::function<void()>, end);
         ManualClock clock;
-        QSignalSpy held(&mPad->finger, &OneFinger::held);
-        mTouch->press(onTheChild ? mPad->child : mPad.get(), QPoint(20, 30));
-        QCOMPARE(mPad->finger.receiver(), onTheChild ? mPad->child : mPad.get());
-        mPad->finger.startHold(700);
+        QSignalSpy held(&m_pad->finger, &OneFinger::held);
+        m_touch->press(onTheChild ? m_pad->child : m_pad.get(), QPoint(20, 30));
+        QCOMPARE(m_pad->finger.receiver(), onTheChild ? m_pad->child : m_pad.get());
+        m_pad->finger.startHold(700);
         end();
-        QVERIFY(!mPad->finger.isDown());
-        QVERIFY(!mPad->finger.receiver());
-        QVERIFY(!mTouch->isLocked());
+        QVERIFY(!m_pad->finger.isDown());
+        QVERIFY(!m_pad->finger.receiver());
+        QVERIFY(!m_touch->isLocked());
         QCoreApplication::processEvents();
-        QCOMPARE(mCancelled->count(), 1);
+        QCOMPARE(m_cancelled->count(), 1);
         clock.advance(20000);
         QCOMPARE(held.count(), 0);
-        QCOMPARE(mCancelled->count(), 1);
-        mPad->setEnabled(true);
-        mPad->show();
-        mTouch->lift(mPad.get(), QPoint(20, 30));
-        mPad->take();
-        mTouch->tap(mPad.get(), QPoint(20, 30));
-        QCOMPARE(mPad->take(), (QList<Step>{Step::Begin, Step::End}));
+        QCOMPARE(m_cancelled->count(), 1);
+        m_pad->setEnabled(true);
+        m_pad->show();
+        m_touch->lift(m_pad.get(), QPoint(20, 30));
+        m_pad->take();
+        m_touch->tap(m_pad.get(), QPoint(20, 30));
+        QCOMPARE(m_pad->take(), (QList<Step>{Step::Begin, Step::End}));
     }
 
     void theHold()
     {
         ManualClock clock;
-        QSignalSpy held(&mPad->finger, &OneFinger::held);
-        mTouch->press(mPad.get(), QPoint(20, 30));
-        mPad->finger.startHold(700);
+        QSignalSpy held(&m_pad->finger, &OneFinger::held);
+        m_touch->press(m_pad.get(), QPoint(20, 30));
+        m_pad->finger.startHold(700);
         clock.advance(699);
         QCOMPARE(held.count(), 0);
-        mPad->finger.restartHold();
+        m_pad->finger.restartHold();
         clock.advance(699);
         QCOMPARE(held.count(), 0);
         clock.advance(1);
         QCOMPARE(held.count(), 1);
-        mPad->finger.startHold(700);
-        mTouch->lift(mPad.get(), QPoint(20, 30));
+        m_pad->finger.startHold(700);
+        m_touch->lift(m_pad.get(), QPoint(20, 30));
         clock.advance(2000);
         QCOMPARE(held.count(), 1);
-        mPad->finger.startHold(700); // the mouse presses
-        mPad->hide();
+        m_pad->finger.startHold(700); // the mouse presses
+        m_pad->hide();
         clock.advance(2000);
         QCOMPARE(held.count(), 1);
-        QCOMPARE(mCancelled->count(), 1);
+        QCOMPARE(m_cancelled->count(), 1);
     }
 
     void whatTheFingerDoesIsReported()
     {
         QList<QEvent::Type> acted;
-        connect(&mPad->finger, &OneFinger::acted, this, [&](QEvent::Type type) { acted.append(type); });
-        QSignalSpy began(&mPad->finger, &OneFinger::began);
-        QSignalSpy moved(&mPad->finger, &OneFinger::moved);
-        QSignalSpy lifted(&mPad->finger, &OneFinger::lifted);
-        mTouch->press(mPad.get(), QPoint(20, 30));
-        mTouch->move(mPad.get(), QPoint(25, 30));
-        mTouch->lift(mPad.get(), QPoint(25, 30));
+        connect(&m_pad->finger, &OneFinger::acted, this, [&](QEvent::Type type) { acted.append(type); });
+        QSignalSpy began(&m_pad->finger, &OneFinger::began);
+        QSignalSpy moved(&m_pad->finger, &OneFinger::moved);
+        QSignalSpy lifted(&m_pad->finger, &OneFinger::lifted);
+        m_touch->press(m_pad.get(), QPoint(20, 30));
+        m_touch->move(m_pad.get(), QPoint(25, 30));
+        m_touch->lift(m_pad.get(), QPoint(25, 30));
         QCOMPARE(acted, (QList<QEvent::Type>{QEvent::MouseButtonPress, QEvent::MouseMove,
                                              QEvent::MouseButtonRelease}));
         QCOMPARE(began.count(), 1);
         QCOMPARE(moved.count(), 1);
         QCOMPARE(lifted.count(), 1);
-        mTouch->press(mPad.get(), QPoint(20, 30));
-        mPad->finger.cancel();
+        m_touch->press(m_pad.get(), QPoint(20, 30));
+        m_pad->finger.cancel();
         QCOMPARE(lifted.count(), 1);
         QCOMPARE(acted.size(), 4);
     }
 
     void aReceiverMayDestroyTheWidget()
     {
-        connect(&mPad->finger, &OneFinger::lifted, this, [this] { mPad.reset(); });
-        QTouchEvent begin(QEvent::TouchBegin, mTouch->device(), Qt::NoModifier,
+        connect(&m_pad->finger, &OneFinger::lifted, this, [this] { m_pad.reset(); });
+        QTouchEvent begin(QEvent::TouchBegin, m_touch->device(), Qt::NoModifier,
                           {QEventPoint(1, QEventPoint::Pressed, QPointF(40, 30), QPointF(40, 30))});
-        QVERIFY(mPad->finger.takes(&begin));
-        QTouchEvent end(QEvent::TouchEnd, mTouch->device(), Qt::NoModifier,
+        QVERIFY(m_pad->finger.takes(&begin));
+        QTouchEvent end(QEvent::TouchEnd, m_touch->device(), Qt::NoModifier,
                         {QEventPoint(1, QEventPoint::Released, QPointF(40, 30), QPointF(40, 30))});
-        QVERIFY(mPad->finger.takes(&end));
-        QVERIFY(mPad == nullptr);
+        QVERIFY(m_pad->finger.takes(&end));
+        QVERIFY(m_pad == nullptr);
     }
 
     void otherEventsAreNotTaken()
     {
         QEvent event(QEvent::MouseMove);
-        QVERIFY(!mPad->finger.takes(&event));
+        QVERIFY(!m_pad->finger.takes(&event));
     }
 
     void aFingerIsTheLeftButton_data()
@@ -258,17 +258,17 @@ private Q_SLOTS:
 
     void aDisabledWidgetHasNoFinger()
     {
-        mPad->setEnabled(false);
-        QTouchEvent begin(QEvent::TouchBegin, mTouch->device(), Qt::NoModifier,
+        m_pad->setEnabled(false);
+        QTouchEvent begin(QEvent::TouchBegin, m_touch->device(), Qt::NoModifier,
                           {QEventPoint(1, QEventPoint::Pressed, QPointF(40, 30), QPointF(40, 30))});
-        QCOMPARE(mPad->finger.follow(&begin), Step::None);
-        QVERIFY(!mPad->finger.isDown());
+        QCOMPARE(m_pad->finger.follow(&begin), Step::None);
+        QVERIFY(!m_pad->finger.isDown());
     }
 
 private:
-    std::unique_ptr<TouchFixture> mTouch;
-    std::unique_ptr<Pad> mPad;
-    std::unique_ptr<QSignalSpy> mCancelled;
+    std::unique_ptr<TouchFixture> m_touch;
+    std::unique_ptr<Pad> m_pad;
+    std::unique_ptr<QSignalSpy> m_cancelled;
 };
 
 QTEST_MAIN(tst_onefinger)

@@ -20,45 +20,45 @@ private Q_SLOTS:
 
 private:
     // What a window manager does, or seems to do.
-    void carryTo(const QPoint& place) { mDialog->windowHandle()->setPosition(place); }
+    void carryTo(const QPoint& place) { m_dialog->windowHandle()->setPosition(place); }
 
-    std::unique_ptr<QDialog> mDialog;
+    std::unique_ptr<QDialog> m_dialog;
 };
 
 void tst_windowplacekeeper::init()
 {
-    mDialog = std::make_unique<QDialog>(nullptr, Qt::Dialog | Qt::FramelessWindowHint);
-    mDialog->setFixedSize(200, 100);
-    new WindowPlaceKeeper(mDialog.get());
-    mDialog->move(60, 40);
-    mDialog->show();
-    QVERIFY(QTest::qWaitForWindowExposed(mDialog.get(), PATIENCE_MS));
-    QCOMPARE(mDialog->windowHandle()->position(), QPoint(60, 40));
+    m_dialog = std::make_unique<QDialog>(nullptr, Qt::Dialog | Qt::FramelessWindowHint);
+    m_dialog->setFixedSize(200, 100);
+    new WindowPlaceKeeper(m_dialog.get());
+    m_dialog->move(60, 40);
+    m_dialog->show();
+    QVERIFY(QTest::qWaitForWindowExposed(m_dialog.get(), PATIENCE_MS));
+    QCOMPARE(m_dialog->windowHandle()->position(), QPoint(60, 40));
 }
 
 void tst_windowplacekeeper::cleanup()
 {
-    mDialog.reset();
+    m_dialog.reset();
 }
 
 void tst_windowplacekeeper::takesTheWindowBack()
 {
     carryTo({0, 0});
-    QTRY_COMPARE(mDialog->windowHandle()->position(), QPoint(60, 40));
-    QTRY_COMPARE(mDialog->pos(), QPoint(60, 40));
-    mDialog->hide();
+    QTRY_COMPARE(m_dialog->windowHandle()->position(), QPoint(60, 40));
+    QTRY_COMPARE(m_dialog->pos(), QPoint(60, 40));
+    m_dialog->hide();
     carryTo({5, 5});
-    mDialog->move(60, 40);
-    mDialog->show();
-    QTRY_COMPARE(mDialog->windowHandle()->position(), QPoint(60, 40));
+    m_dialog->move(60, 40);
+    m_dialog->show();
+    QTRY_COMPARE(m_dialog->windowHandle()->position(), QPoint(60, 40));
 }
 
 void tst_windowplacekeeper::followsTheProgram()
 {
-    mDialog->move(100, 80);
-    QTRY_COMPARE(mDialog->windowHandle()->position(), QPoint(100, 80));
+    m_dialog->move(100, 80);
+    QTRY_COMPARE(m_dialog->windowHandle()->position(), QPoint(100, 80));
     carryTo({1, 1});
-    QTRY_COMPARE(mDialog->pos(), QPoint(100, 80));
+    QTRY_COMPARE(m_dialog->pos(), QPoint(100, 80));
 }
 
 void tst_windowplacekeeper::doesNotQuarrel()
@@ -69,13 +69,13 @@ void tst_windowplacekeeper::doesNotQuarrel()
         carryTo({0, 0});
         QCoreApplication::processEvents();
         QCoreApplication::sendPostedEvents();
-    } while (mDialog->windowHandle()->position() != QPoint(0, 0) && ++times < 100);
+    } while (m_dialog->windowHandle()->position() != QPoint(0, 0) && ++times < 100);
     QVERIFY2(times >= 1 && times <= 3, qPrintable(QString::number(times)));
-    mDialog->hide();
-    mDialog->move(60, 40);
-    mDialog->show();
+    m_dialog->hide();
+    m_dialog->move(60, 40);
+    m_dialog->show();
     carryTo({0, 0});
-    QTRY_COMPARE(mDialog->windowHandle()->position(), QPoint(60, 40));
+    QTRY_COMPARE(m_dialog->windowHandle()->position(), QPoint(60, 40));
 }
 
 QTEST_MAIN(tst_windowplacekeeper)
