@@ -10,8 +10,11 @@ inline QStringList textLines(const QWidget* item)
 {
     QStringList lines;
     const QList<QLabel*> labels = item->findChildren<QLabel*>();
-    for (const QLabel* label : labels)
-        lines.append(label->text());
+    for (const QLabel* label : labels) {
+        const bool isHandle = label->parentWidget() == item;
+        if (!isHandle)
+            lines.append(label->text());
+    }
     return lines;
 }
 
