@@ -6,9 +6,7 @@
 #include "touchui/KSInputContext.h"
 
 #include <QApplication>
-#include <QDir>
 #include <QEvent>
-#include <QFileInfo>
 #include <QString>
 #include <QStringList>
 #include <QTest>
@@ -63,19 +61,6 @@ int run(int argc, char** argv)
     Test test;
     return QTest::qExec(&test, argc, argv);
 }
-
-// Returns a folder in memory if possible: every step saves the title, which would otherwise wait for the
-// disk.
-inline QString dataFolder()
-{
-    const QString memory = QStringLiteral("/dev/shm");
-    return QFileInfo(memory).isWritable() ? memory : QDir::tempPath();
-}
-
-// Sets the folder for temporary files. Declare it before a fixture that uses one.
-struct DataInMemory {
-    DataInMemory() { qputenv("TMPDIR", dataFolder().toLocal8Bit()); }
-};
 
 // Hides the log lines for saving, which would fill the output.
 inline void showErrorsOnly()

@@ -319,9 +319,6 @@ void tst_canvasscene_undo::initTestCase()
     qRegisterMetaType<TText*>("TText*");
     m_edits = runLength("TITLER_EDITS", DEFAULT_EDITS);
     qInfo("seed %u, %d edits", quint32(RandomSeed(DEFAULT_SEED)), m_edits);
-    // Every step saves the title; in memory that does not wait for a disk.
-    if (QFileInfo(QStringLiteral("/dev/shm")).isWritable())
-        qputenv("TMPDIR", "/dev/shm");
     // A line for every save would be all that is to be seen.
     qInstallMessageHandler(ignoreDebug);
 }

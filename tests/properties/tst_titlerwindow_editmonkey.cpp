@@ -94,7 +94,6 @@ private:
     QString misplaced() const;
     QByteArray replay(const QString& name);
 
-    MonkeyGround::DataInMemory m_inMemory;
     LibraryFixture m_files; // titles are edited below their root only
     QTemporaryDir m_data;
     Siblings m_siblings;

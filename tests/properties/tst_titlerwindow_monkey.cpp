@@ -128,7 +128,6 @@ private:
         return [this, what](Arguments...) { ++m_counts[QLatin1String(what)]; };
     }
 
-    MonkeyGround::DataInMemory m_inMemory;
     TemplateFixture m_files;
     TitleAccount m_account{m_files};
     Siblings m_siblings;
