@@ -342,7 +342,7 @@ void tst_toolsbar::menuReportsItsActions()
         QCOMPARE(clicked.count(), i + 1);
         QCOMPARE(clicked.at(i).at(0).value<QAction*>()->data().toInt(), i);
     }
-    // Between the items nothing is chosen and the menu stays.
+    // A click between the items chooses none, and the menu stays open.
     openMenu();
     QTest::mouseClick(menu(), Qt::LeftButton, Qt::NoModifier, QPoint(100, 11 + 62));
     QVERIFY(menu()->isVisible());
@@ -386,7 +386,7 @@ void tst_toolsbar::touchBesideTheMenuOnlyCloses()
     QCOMPARE(closed.count(), 1);
 }
 
-// It slid off the button, which opens the menu while the finger is still down.
+// The finger slides off the button, which opens the menu while the finger is still down.
 void tst_toolsbar::fingerThatOpenedTheMenuIsLifted()
 {
     KSPushbutton* canvas = button("Canvas");
@@ -434,7 +434,7 @@ void tst_toolsbar::menuMarksTheItemUnderTheFinger()
     m_bar->hideCanvasMenu();
 }
 
-// A step that comes by a timer leaves nothing to redo, whatever is touched meanwhile.
+// A step that a timer pushes clears the redo steps, also while a button is touched.
 void tst_toolsbar::disablingAnotherButtonLeavesTheTouchAlone()
 {
     QSignalSpy clicked(m_bar, &ToolsBar::folderButtonClick);

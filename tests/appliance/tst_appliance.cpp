@@ -322,7 +322,7 @@ void tst_appliance::createSessionResult()
     QCOMPARE(result["paths"].toArray(),
              (QJsonArray{QString::fromUtf8("/資料/1.xml"), QString::fromUtf8("/資料/2.xml")}));
     CSimpleBuffer::simplebuffer_destroy(&paths);
-    command("wait-result 50"); // it was the only one
+    command("wait-result 50"); // there is no second result
     QCOMPARE(event("timeout")["command"].toString(), "wait-result 50");
 }
 
@@ -365,7 +365,7 @@ void tst_appliance::messages()
     command("message-close 117 2");
     command("top-window 2");
     expect({"close message 117 2", "top window 2"});
-    center->unregisterNotify(999); // somebody else
+    center->unregisterNotify(999); // the notify of another client
     command("wait-call MessageCenter unregisterNotify");
     event("waited-call");
     command("message-close 117 1");

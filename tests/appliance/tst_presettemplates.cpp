@@ -58,7 +58,7 @@ QImage emptyPicture()
     return image;
 }
 
-// Around what differs clearly between two pictures; soft shadows do not count.
+// Returns the rectangle in which two pictures differ clearly; soft shadows do not count.
 QRect changedRect(const QImage& one, const QImage& other)
 {
     constexpr int CLEARLY = 96;
@@ -208,9 +208,9 @@ void tst_presettemplates::backgroundsHaveAlphaAtBothSizes()
         }
     }
     QVERIFY(through > 0);
-    // Only the one that covers the whole picture leaves nothing free.
+    // Only the full screen design covers the whole picture.
     QCOMPARE(clear == 0, sample.stem == "FullScreen");
-    // The small one is the big one made smaller.
+    // The small background is the large one scaled down.
     const QImage reduced =
         over(Qt::gray, big).scaled(CANVAS, Qt::IgnoreAspectRatio, Qt::SmoothTransformation);
     const QImage painted = over(Qt::gray, small);
@@ -223,7 +223,7 @@ void tst_presettemplates::backgroundsHaveAlphaAtBothSizes()
 
 void tst_presettemplates::textStandsWhereItIsPut()
 {
-    constexpr int TOLERANCE = 6; // bearings of the letters and whole pixels of the canvas
+    constexpr int TOLERANCE = 6; // for the bearings of the letters, and since places are whole pixels of the canvas
     for (const auto align : {SampleText::LEFT, SampleText::CENTRE, SampleText::RIGHT}) {
         for (const int size : {44, 138}) {
             SampleText::Look look;

@@ -1,4 +1,4 @@
-// Who shares the decoded pixels of a background file, and who must not.
+// Which objects share the decoded pixels of a background file, and which must not.
 #include "canvas/BackgroundPicture.h"
 #include "canvas/GraphicsPixmap.h"
 

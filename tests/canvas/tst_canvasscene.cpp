@@ -125,7 +125,7 @@ void tst_canvasscene::nullTitleEmptiesTheCanvas()
     QCOMPARE(button.last(), QVariantList({true}));
     QCOMPARE(canvas.scene->getTextItemList().size(), 0);
     QCOMPARE(canvas.scene->items().size(), 4);
-    // The title that was shown before stays as it is.
+    // The previous title does not change.
     canvas.scene->saveArchive();
     QCOMPARE(canvas.saved()->getText().size(), size_t(1));
 }
@@ -166,7 +166,7 @@ void tst_canvasscene::missingFontWhileVisible()
     QCOMPARE(messages->posted.size(), 1);
     QCOMPARE(messages->posted.at(0).first, 109);
     QCOMPARE(messages->posted.at(0).second, QStringLiteral("No Such Family"));
-    // The family that stands in is written back.
+    // The substitute family is saved.
     const auto saved = canvas.saved();
     QVERIFY(saved);
     QCOMPARE(saved->getText()[0]->getTextItems()[0]->getFontFamily(), std::string("KST"));
@@ -278,7 +278,7 @@ void tst_canvasscene::newObjectTakesThePanelsStyle()
         property.getTextShadow()->setShadowDirectionX(4);
         canvas.scene->slotUpdateCurrentTextProperty(property);
     });
-    // What was sent for another object before, or only tried out on it, does not count.
+    // Styles that were sent for another object before, or only previewed on it, are not used.
     canvas.scene->slotSceneInputLanguageChanged(SystemSetupDef::emInputLanguageKorean);
     for (const int undoFlag : {1, 0}) {
         TText sent = makeSource(makeStyle("", "KST", 72), 3);
@@ -305,7 +305,7 @@ void tst_canvasscene::languageChangeChoosesTheFamily()
     QCOMPARE(InputLanguageFonts::mInputLanguage, 3);
     typeText(*canvas.text(1), "a");
     QCOMPARE(canvas.text(1)->getItemTText()->textItems()[0]->getFontFamily(), std::string("KST"));
-    // Only the first object after the change.
+    // Only the first object after the change of language gets that family.
     canvas.scene->slotInsertNewTextItem();
     QCOMPARE(canvas.text(2)->getLastAlpaTextStyleValue()->textItems()[0]->getFontFamily(),
              std::string("KST"));
@@ -330,7 +330,7 @@ void tst_canvasscene::chinaModel()
     canvas.scene->slotInsertNewTextItem();
     QCOMPARE(canvas.text(1)->getLastAlpaTextStyleValue()->textItems()[0]->getFontFamily(),
              std::string("DFHeiW5-A"));
-    // A family chosen in the panel counts again.
+    // A family that is chosen in the panel is used again.
     TText sent = makeSource(makeStyle("", "DejaVu Sans"), 1);
     canvas.scene->slotChangeObjectTextStyle(&sent, 0, 1);
     canvas.scene->slotInsertNewTextItem();
@@ -598,7 +598,7 @@ void tst_canvasscene::undoneObjectLeavesNoStep()
     typeText(*item, "abc");
     canvas.stack.undo();
     QCOMPARE(canvas.text(1), nullptr);
-    // Typing that was under way, and a finger that rests, have nothing more to say.
+    // Unfinished typing and a long press have no effect on a deleted object.
     item->pushLastEditTextIntoStack();
     item->slotLongPressed();
     QCOMPARE(canvas.stack.count(), 1);
@@ -655,7 +655,7 @@ void tst_canvasscene::picturesFollowTheTitle()
     canvas.open({makeRecord("a")});
     canvas.scene->createThumnailPicture();
     QCOMPARE(canvas.log.fast, 1);
-    // No file yet: no pictures, and the wish is forgotten.
+    // Without a file no pictures are made, and they are not made later either.
     canvas.scene->slotMakeSceneThumnail();
     QCOMPARE(canvas.log.slow, 0);
     canvas.scene->saveArchive();
@@ -692,7 +692,7 @@ void tst_canvasscene::missingPictureIsMadeAgain()
         QCOMPARE(canvas.log.slow, 1);
         QVERIFY(QImage(4, 4, QImage::Format_RGB32).save(canvas.folder.filePath(name)));
     }
-    // Names that lead elsewhere are nobody's pictures.
+    // Picture names that lead out of the folder are not the title's.
     canvas.log.slow = 0;
     canvas.title.setThumbnailBig("../elsewhere.png");
     canvas.open({makeRecord("a")});

@@ -73,7 +73,7 @@ void tst_canvasscene_fulldisk::refusedEditIsToldOnceAndSavedWhenThereIsRoom()
         type(canvas, "c");
         QCOMPARE(onDisk(path), before);
     }
-    // Nobody does anything.
+    // The title is saved later without any action of the operator.
     QTRY_VERIFY(onDisk(path) != before);
     QVERIFY(hasText(path, "abc"));
     QCOMPARE(messages->posted, (Posted{{114, "File"}}));
@@ -81,7 +81,7 @@ void tst_canvasscene_fulldisk::refusedEditIsToldOnceAndSavedWhenThereIsRoom()
     {
         const FullDisk disk;
         type(canvas, "d");
-        QTRY_COMPARE(messages->posted.size(), 2); // the next outage
+        QTRY_COMPARE(messages->posted.size(), 2); // reported again for the next outage
     }
 }
 
@@ -96,21 +96,21 @@ void tst_canvasscene_fulldisk::refusedEditIsSavedWithTheNextChange()
         type(canvas, "b");
         QTRY_COMPARE(messages->posted.size(), 1);
     }
-    // In another title.
+    // The same while another title is shown.
     canvas.title.setPath(canvas.folder.filePath("other.xml").toStdString());
     canvas.open({makeRecord("x")});
     type(canvas, "y");
     QVERIFY(onDisk(first).contains("text=\"ab\"") || hasText(first, "ab"));
     QVERIFY(RefusedWrites::isEmpty());
     QVERIFY(hasText(canvas.folder.filePath("other.xml"), "xy"));
-    // That outage is over. The next one may begin at once.
+    // The outage is over. The next one may begin immediately.
     QCoreApplication::processEvents();
     const FullDisk disk;
     type(canvas, "z");
     QTRY_COMPARE(messages->posted.size(), 2);
 }
 
-// The list reads a title anew after each save.
+// The list reads a title again after each save.
 void tst_canvasscene_fulldisk::refusedEditIsWhatIsReadAgain()
 {
     Canvas canvas;

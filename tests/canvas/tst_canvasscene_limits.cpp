@@ -80,7 +80,7 @@ void tst_canvasscene_limits::threeHundredOfEveryStyle()
     QVERIFY(item->getItemTText()->textItemsIsTheSame(record));
     canvas.scene->saveArchive();
     QVERIFY(canvas.saved()->getText()[0]->textItemsIsTheSame(record));
-    // One property of all of them; the others stay as mixed as they were.
+    // Changes one property of all characters; their other properties stay different.
     item->changeItemToSolidLineState();
     TText source = record;
     StyleProperties::set(TextObjectConstants::PropertySize, source, 0);
@@ -118,7 +118,7 @@ void tst_canvasscene_limits::limitInEveryPlace()
     QCOMPARE(item->toPlainText(), result);
     QCOMPARE(item->textCursor().position(), at + 10);
     QVERIFY(inStep(*item));
-    // A full text takes nothing more, wherever.
+    // Nothing can be inserted into a full text, at any position.
     typeTextAt(*item, at, "yz");
     QCOMPARE(item->toPlainText(), result);
     QVERIFY(inStep(*item));
@@ -133,7 +133,7 @@ void tst_canvasscene_limits::emojiAtTheLimit()
     canvas.open({makeRecord(QString(299, 'a'), 1, "KST", 20)});
     GraphicsText* item = canvas.text(1);
     item->initNewTextSelectAll();
-    // Half a character is none.
+    // A character of two units does not fit into the room for one.
     typeTextAt(*item, 299, QString::fromUtf8("😀"));
     QCOMPARE(item->toPlainText(), QString(299, 'a'));
     QVERIFY(inStep(*item));
@@ -224,7 +224,7 @@ void tst_canvasscene_limits::idsComeBack()
     canvas.text(1)->changeItemToSolidLineState();
     canvas.scene->deleteSelectedItems();
     QCOMPARE(canvas.text(1), nullptr);
-    // Back to before everything: the first "two" has its number again.
+    // After everything is undone, the first "two" has its number again.
     while (canvas.stack.canUndo())
         canvas.stack.undo();
     QCOMPARE(canvas.scene->getTextItemList().size(), 3);
@@ -276,7 +276,7 @@ void tst_canvasscene_limits::sizes()
     const int step = size / 34 + (size % 34 > 17 ? 1 : 0);
     QCOMPARE(item->getItemTText()->getTextShadow()->getShadowDirectionX(), step * 4);
     QCOMPARE(item->getItemTText()->getTextShadow()->getShadowBlurRadius(), step * 16.0);
-    // It is drawn and edited like any other.
+    // The object can be drawn and edited like any other.
     canvas.show();
     item->initNewTextSelectAll();
     QVERIFY(!canvas.view.grab().isNull());
@@ -293,11 +293,11 @@ void tst_canvasscene_limits::emptyObjectsAreSwept()
     canvas.open({makeRecord("kept", 1)});
     canvas.scene->slotInsertNewTextItem();
     QVERIFY(canvas.text(2));
-    // The next new object sweeps it, and takes its number.
+    // The next new object removes the blank one and takes its number.
     canvas.scene->slotInsertNewTextItem();
     QVERIFY(canvas.text(2));
     QVERIFY(!canvas.text(3));
-    // So does another title.
+    // Showing another title removes it, too.
     Archive other;
     other.setPath((canvas.folder.path() + "/other.xml").toStdString());
     canvas.scene->slotUpdateArchive(&other);
@@ -332,7 +332,7 @@ void tst_canvasscene_limits::blankObjectsAreSwept()
     QVERIFY(canvas.text(2));
     QCOMPARE(canvas.stack.count(), steps + (swept ? 1 : 0));
     canvas.stack.undo();
-    // The object is back with its blanks; without a sweep the typing was undone.
+    // The object with its blanks is restored if it was removed; otherwise the typing is undone.
     QVERIFY(canvas.text(1));
     QCOMPARE(canvas.text(1)->toPlainText(), swept ? text : QString());
 }
@@ -397,13 +397,13 @@ void tst_canvasscene_limits::removedFont()
     connect(item, &GraphicsText::signalShowMessageWhenUsingDefaultFont, item,
             [&reported](const QString& name) { reported.append(name); });
     QVERIFY(!canvas.view.grab().isNull());
-    // What is typed now takes a family that exists.
+    // Text that is typed now gets a family that exists.
     typeTextAt(*item, 2, "c");
     QCOMPARE(item->toPlainText(), QStringLiteral("abc"));
     QCOMPARE(item->getItemTText()->textItems()[2]->getFontFamily(), std::string("KST"));
     QVERIFY(reported.contains(QString::fromUtf8(family)));
     QVERIFY(!canvas.view.grab().isNull());
-    // So does what is styled, undone and redone.
+    // So does text that is styled, undone and redone.
     selectRange(*item, 0, 1);
     TText source = makeSource(makeStyle("", family.constData(), 50), 1);
     canvas.scene->slotChangeObjectTextStyle(&source, TextObjectConstants::PropertySize, 1);

@@ -115,7 +115,7 @@ void tst_canvasscene_saving::blankObjectIsNotSaved()
     canvas.stack.undo();
     QVERIFY(canvas.text(2));
     QCOMPARE(textsInFile(canvas), QStringList{"kept"});
-    // It is a text like any other as soon as there is something to see.
+    // The object is saved as soon as it has visible characters.
     canvas.text(2)->initNewTextSelectAll();
     typeText(*canvas.text(2), QStringLiteral("x"));
     canvas.text(2)->pushLastEditTextIntoStack();
@@ -134,7 +134,7 @@ void tst_canvasscene_saving::leavingTheTitleTakesBlanksAway()
     Canvas canvas;
     canvas.show();
     canvas.open({makeRecord("kept")});
-    // A blank object that is neither edited nor selected, and one under a finger.
+    // Neither a blank object that is neither edited nor selected, nor one under a finger, is saved.
     canvas.scene->slotInsertNewTextItem();
     canvas.scene->clearItemsSelectionAndFocus();
     canvas.scene->slotSetCurrentMousePressedObjectId(2);
@@ -145,7 +145,7 @@ void tst_canvasscene_saving::leavingTheTitleTakesBlanksAway()
     QVERIFY(!canvas.scene->itemIsEditorInteraction() && !canvas.scene->itemIsSelectionMode());
     QCOMPARE(textsInFile(canvas), QStringList{"kept"});
     QCOMPARE(canvas.log.slow, 1);
-    // Such an object does not count among the four, either.
+    // A blank object does not count among the four objects, either.
     canvas.open({makeRecord("1", 1), makeRecord("2", 2), makeRecord("3", 3)});
     canvas.scene->slotInsertNewTextItem();
     canvas.scene->clearItemsSelectionAndFocus();

@@ -150,7 +150,7 @@ void tst_canvasscene_touch::rightButtonDoesNothing()
     QCOMPARE(canvas.text(1)->getFocusFlag(), -1);
     canvas.tap(canvas.pointOn(1));
     QCOMPARE(canvas.text(1)->getFocusFlag(), 1);
-    // Nor does it end what is going on.
+    // The right button does not end editing, either.
     QSignalSpy selected(canvas.scene.get(), &CanvasScene::signalSceneNotifyIfExistSelectedObject);
     for (const QPoint place : {canvas.pointOn(1), EmptyPlace}) {
         QTest::mouseClick(canvas.view.viewport(), Qt::RightButton, {}, place);
@@ -166,7 +166,7 @@ void tst_canvasscene_touch::rightButtonDoesNothing()
         QCOMPARE(canvas.text(1)->textInteractionFlags(), Qt::TextEditorInteraction);
     }
     QVERIFY(selected.isEmpty());
-    // And the next left press is nobody's but that of what lies there.
+    // The next left press goes to the item at its place.
     canvas.tap(EmptyPlace);
     QCOMPARE(canvas.text(1)->textInteractionFlags(), Qt::NoTextInteraction);
 }

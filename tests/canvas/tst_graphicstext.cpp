@@ -173,7 +173,7 @@ void tst_graphicstext::typingTakesThePreviousStyle()
     QCOMPARE(pair.record().textItems()[1]->getText(), std::string("x"));
     typeTextAt(*pair.child, 3, "y");
     QCOMPARE(pair.record().textItems()[3]->getFontColor(), std::string("#112233"));
-    // The family that the language had when the character was typed.
+    // Each character keeps the family that its language had when it was typed.
     QCOMPARE(pair.record().textItems()[3]->getAlphaDefaultFontOfInputLanguage(), std::string("KST"));
     typeText(*pair.child, QString::fromUtf8("快"));
     QCOMPARE(pair.record().textItems()[4]->getAlphaDefaultFontOfInputLanguage(),
@@ -191,7 +191,7 @@ void tst_graphicstext::startOfLine()
     Pair pair(record);
     typeTextAt(*pair.child, 2, "x");
     QCOMPARE(pair.record().textItems()[2]->getFontSize(), 50);
-    // An empty line: the line break before lends its style.
+    // In an empty line the style of the line break before it is used.
     typeTextAt(*pair.child, 5, "y");
     QCOMPARE(pair.record().textItems()[5]->getFontSize(), 60);
     typeTextAt(*pair.child, 0, "z");
@@ -211,7 +211,7 @@ void tst_graphicstext::emptyObjectTakesTheLastStyle()
     QCOMPARE(modes.count(), 1);
     QCOMPARE(modes.at(0), QVariantList({false, false}));
     QCOMPARE(pair.child->getLastAlpaTextStyleValue()->textItems()[0]->getFontSize(), 71);
-    // The empty line keeps the height of what stood there.
+    // The empty line keeps the height of the deleted characters.
     QCOMPARE(pair.child->font().pixelSize(), 47);
     typeText(*pair.child, "c");
     QCOMPARE(pair.record().textItems()[0]->getFontSize(), 71);
@@ -333,7 +333,7 @@ void tst_graphicstext::typingBurstIsOneStep()
     QCOMPARE(after, QStringLiteral("abcd"));
     pair.child->pushLastEditTextIntoStack();
     QCOMPARE(edited.count(), 1);
-    // What was typed and taken back leaves no step.
+    // Typing that is deleted again does not make an undo step.
     typeText(*pair.child, "e");
     QTextCursor cursor = pair.child->textCursor();
     cursor.deletePreviousChar();
@@ -463,7 +463,7 @@ void tst_graphicstext::savedStyleForNextCharacter()
     QCOMPARE(InputLanguageFonts::LAST_KEEPED_FONT[4][InputLanguageFonts::Latin],
              QStringLiteral("DejaVu Sans"));
 
-    // Moving the caret forgets it.
+    // Moving the caret drops the style for the next character.
     pair.child->saveStyleForNextInsert(&style, 1, 1);
     cursor = pair.child->textCursor();
     cursor.setPosition(0);
@@ -503,7 +503,7 @@ void tst_graphicstext::moveByPanel()
     QCOMPARE(moved.at(0).at(1).toPointF(), QPointF(300.0, 200.0));
     QCOMPARE(moved.at(0).at(2).toPointF(), QPointF(310.0, 220.0));
 
-    // Too far right: a hundred pixels stay inside.
+    // An object that is moved too far to the right stays inside by a hundred pixels.
     source.setXValue(5000.0F);
     pair.child->changeAllStyleWhenSelectionMode(&source, 11, true, 1);
     QCOMPARE(pair.parent->x(), TextObjectConstants::SCENE_RECT.width() - 100.0);

@@ -234,7 +234,7 @@ void tst_scenekeyboard::tapOnEmptyCanvasClosesTheKeyboard()
     canvas.open({makeRecord("MMMM")});
     canvas.edit(1, canvas.caretIn(*canvas.text(1), 2));
     QVERIFY(!KSInputContext::isSoftKeyboardClosed());
-    // On the object it stays.
+    // A tap on the object keeps the keyboard open.
     canvas.touchTap(canvas.caretIn(*canvas.text(1), 1));
     QVERIFY(!KSInputContext::isSoftKeyboardClosed());
     const qsizetype before = m_keyboard->calls.count("dummyClose");
@@ -285,7 +285,7 @@ void tst_scenekeyboard::fourScripts()
     for (int i = 1; i < int(styles.size()); ++i) {
         const QChar c = item->toPlainText().at(i);
         const bool isLatin = InputLanguageFonts::getSoftkeyboardMode(c) == InputLanguageFonts::Latin;
-        // Where the script changes, the family used last for it is taken; the first run keeps its own.
+        // A change of script takes the family last used for that script; the first run keeps its own family.
         const QString expected = i <= 5 ? QStringLiteral("KST") : (isLatin ? latin : asian);
         QCOMPARE(QString::fromStdString(styles[size_t(i)]->getFontFamily()), expected);
         QCOMPARE(QString::fromStdString(styles[size_t(i)]->getAlphaDefaultFontOfInputLanguage()),
@@ -311,7 +311,7 @@ void tst_scenekeyboard::keysOfTheKeyboard()
     sendKey(Qt::Key_Backspace, QString());
     QCOMPARE(item->toPlainText(), QString::fromUtf8("abc快é"));
     QVERIFY(inStep(*item));
-    // None of them was sent back to where it came from.
+    // No key was sent back to the service it came from.
     QVERIFY(m_keyboard->keys.isEmpty());
     // A key of a physical keyboard goes to the service, which decides what becomes of it.
     QTest::keyClick(canvas.window.windowHandle(), Qt::Key_Q);
@@ -330,7 +330,7 @@ void tst_scenekeyboard::emojiAndMarkSurvive()
     GraphicsText* item = canvas.text(1);
     QCOMPARE(item->toPlainText(), text);
     QCOMPARE(item->getItemTText()->textItems().size(), size_t(6));
-    // Styled: everything, then half of the pair, which no tool can select alone.
+    // Styles the whole text, then half of a pair, which no tool can select alone.
     selectRange(*item, 0, 6);
     TText large = makeSource(makeStyle("", "KST", 150), 6);
     canvas.scene->slotChangeObjectTextStyle(&large, TextObjectConstants::PropertySize, 1);
@@ -416,14 +416,14 @@ void tst_scenekeyboard::cursorMessages()
         QCOMPARE(modes.last(), QVariantList({shadow, false}));
     else
         QCOMPARE(modes.count(), 0);
-    // The panel shows the styles that are selected, or the one before the cursor.
+    // The panel shows the styles of the selection, or that of the character before the cursor.
     const int first = anchor == position ? position - 1 : qMin(anchor, position);
     QCOMPARE(shown.size(), qMax(1, qAbs(anchor - position)));
     QCOMPARE(shown.first(), 60 + first);
     QCOMPARE(canvas.stack.count(), 0);
 }
 
-// Keyboards may count characters otherwise; the cursor stands before a pair, never in it.
+// Keyboards may count characters differently: a cursor inside a pair is moved before it.
 void tst_scenekeyboard::cursorInsideACharacter()
 {
     TouchCanvas canvas(m_device);
@@ -472,7 +472,7 @@ void tst_scenekeyboard::changeOfTheWholeEndsEditing_data()
     QTest::newRow("shadow") << int(TextObjectConstants::PropertyShadow);
 }
 
-// With all of the text selected these tools apply; the object is selected as one after that.
+// These tools are enabled while the whole text is selected. Using one ends editing and selects the object.
 void tst_scenekeyboard::changeOfTheWholeEndsEditing()
 {
     QFETCH(int, property);
@@ -491,7 +491,7 @@ void tst_scenekeyboard::changeOfTheWholeEndsEditing()
     QCOMPARE(item->textInteractionFlags(), Qt::NoTextInteraction);
     QCOMPARE(m_keyboard->calls.count("dummyClose"), before + 1);
     QVERIFY(KSInputContext::isSoftKeyboardClosed());
-    // A selected object has no keyboard to put away.
+    // The keyboard is not open while an object is selected, so it is not closed.
     source.setTextAlign(0);
     source.setShadowStyle(2);
     canvas.scene->slotChangeObjectTextStyle(&source, property, 1);
@@ -540,7 +540,7 @@ void tst_scenekeyboard::closeOnText()
     QCOMPARE(exists.last(), QVariantList({true}));
     QVERIFY(KSInputContext::isSoftKeyboardClosed());
     QCOMPARE(canvas.saved()->getText()[0]->getText(), std::string("MMMMx"));
-    // The pictures follow when the title is left.
+    // The pictures are made when another title is shown.
     canvas.scene->slotMakeSceneThumnail();
     QCOMPARE(canvas.log.slow, 1);
 }
@@ -595,13 +595,13 @@ void tst_scenekeyboard::closeMakesAStepOfTyping()
     QCOMPARE(canvas.text(1)->toPlainText(), QStringLiteral("M"));
     canvas.stack.redo();
     QCOMPARE(canvas.text(1)->toPlainText(), QStringLiteral("Mab"));
-    // Closing again without a change makes no step.
+    // Closing again without a change does not make an undo step.
     canvas.text(1)->initNewTextSelectAll();
     sendClose();
     QCOMPARE(canvas.stack.count(), 1);
 }
 
-// The window leaves editing before it undoes; with the keyboard closed there is nothing left to leave.
+// The window ends editing before it undoes; after the keyboard was closed, editing has ended already.
 void tst_scenekeyboard::undoAfterCloseLosesNothing()
 {
     TouchCanvas canvas(m_device);
@@ -619,7 +619,7 @@ void tst_scenekeyboard::undoAfterCloseLosesNothing()
     canvas.stack.redo();
     QCOMPARE(item->toPlainText(), QStringLiteral("Mab"));
 
-    // A drag right after closing is a step of its own, above that of the typing.
+    // A drag after the keyboard was closed is an undo step of its own, after that of the typing.
     canvas.touchTap(canvas.pointOn(1));
     canvas.edit(1, canvas.caretIn(*item, 3));
     sendText("c");
@@ -678,7 +678,7 @@ void tst_scenekeyboard::pasteOfTenThousand()
     QCOMPARE(canvas.stack.count(), 1);
     canvas.stack.undo();
     QCOMPARE(item->toPlainText(), QStringLiteral("ab"));
-    // From the clipboard as well.
+    // Pasted text as well.
     canvas.touchTap(canvas.pointOn(1));
     sendClose();
     canvas.text(1)->initNewTextSelectAll();
@@ -701,14 +701,14 @@ void tst_scenekeyboard::serviceDiesInMidWord()
     QCOMPARE(m_keyboard->keys.size(), 1);
     sendText("k");
     m_keyboard->alive = false;
-    // From now on no key may wait for an answer that will not come.
+    // Further keys must not wait for an answer, since the service is dead.
     for (const char letter : {'i', 'n', 'g'})
         QTest::keyClick(canvas.window.windowHandle(), letter);
     QCOMPARE(m_keyboard->keys.size(), 1);
     QCOMPARE(item->toPlainText(), QStringLiteral("MBreaking"));
     QVERIFY(KSInputContext::isSoftKeyboardClosed());
     QCOMPARE(item->getFocusFlag(), int(TextObjectConstants::FocusEdit));
-    // Leaving saves all of it, as one step.
+    // Leaving the object saves the whole text as one undo step.
     canvas.touchTap(QPoint(80, 600));
     QCOMPARE(canvas.saved()->getText()[0]->getText(), std::string("MBreaking"));
     QCOMPARE(canvas.stack.count(), 1);
@@ -718,7 +718,7 @@ void tst_scenekeyboard::serviceDiesInMidWord()
     QCOMPARE(item->toPlainText(), QStringLiteral("MBreaking!"));
 }
 
-// Nothing of the keyboard is heard any more: what was typed becomes a step and is saved by itself.
+// The keyboard service is dead: the typed text becomes an undo step and is saved without it.
 void tst_scenekeyboard::serviceDiesWithoutATrace()
 {
     TouchCanvas canvas(m_device);

@@ -210,7 +210,7 @@ void tst_styledispatch::everyPropertyOfAnObject()
     QCOMPARE(StyleProperties::describe(*canvas.text(1)->getItemTText()), before);
     canvas.stack.redo();
     QCOMPARE(StyleProperties::describe(*canvas.text(1)->getItemTText()), after);
-    // What lies on disk is what shows.
+    // The saved title equals the shown one.
     const auto saved = canvas.saved();
     QVERIFY(saved->getText()[0]->textItemsIsTheSame(*canvas.text(1)->getItemTText()));
     QCOMPARE(saved->getText()[0]->getTextAlign(), canvas.text(1)->getItemTText()->getTextAlign());
@@ -286,7 +286,7 @@ void tst_styledispatch::everyPropertyOfTheNextCharacter()
     QCOMPARE(stylesOf(*item).at(2), StyleProperties::describe(*source.textItems().front()));
     QCOMPARE(stylesOf(*item).at(1), before.at(1));
     QCOMPARE(stylesOf(*item).at(3), before.at(2));
-    // And so does the one after it.
+    // The next character gets the style, too.
     typeText(*item, "y");
     QCOMPARE(stylesOf(*item).at(3), StyleProperties::describe(*source.textItems().front()));
     item->pushLastEditTextIntoStack();
@@ -369,7 +369,7 @@ void tst_styledispatch::previewThenCancel()
     canvas.scene->slotChangeObjectTextStyle(&original, id, 2);
     QCOMPARE(canvas.stack.count(), 0);
     QCOMPARE(StyleProperties::describe(*item->getItemTText()), before);
-    // The next step starts from there.
+    // The next undo step starts from the state before the preview.
     TText commit = sent(*item, TextObjectConstants::PropertyKerning, 0);
     canvas.scene->slotChangeObjectTextStyle(&commit, TextObjectConstants::PropertyKerning, 1);
     canvas.stack.undo();

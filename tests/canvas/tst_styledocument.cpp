@@ -201,7 +201,7 @@ void tst_styledocument::neighbourStyle()
     QCOMPARE(style.getFontSize(), 40);
     document.copyNeighbourStyle(1, true, QChar('c'), style);
     QCOMPARE(style.getFontSize(), 50);
-    // Nothing stands before the first character: its own style is taken.
+    // There is no character before the first one, so its own style is used.
     document.copyNeighbourStyle(0, false, QChar('c'), style);
     QCOMPARE(style.getFontSize(), 40);
 }
@@ -253,7 +253,7 @@ void tst_styledocument::pairsSurviveNormalising()
     QCOMPARE(record.textItems()[1]->getText(), smile.toStdString());
     QCOMPARE(record.textItems()[2]->getText(), std::string());
     QCOMPARE(record.textItems()[2]->getFontSize(), 11);
-    // The second half is made where it is missing, and one that belongs to nothing goes.
+    // A missing second half of a pair is added, and a second half without a first one is removed.
     TText foreign = makeRecord("ab");
     foreign.textItems()[0]->setText(smile.toStdString());
     foreign.textItems()[1]->setText(std::string());
@@ -379,7 +379,7 @@ void tst_styledocument::sameStyles()
     families.textItems()[0]->setFontFamily("");
     QVERIFY(StyleComparison::isTheSame(families));
 
-    // Only a first character that has the property can be contradicted.
+    // The texts only count as different if the first character has the property.
     TText bold = makeRecord("ab");
     bold.textItems()[1]->setFontBold(1);
     QVERIFY(StyleComparison::isTheSame(bold));

@@ -117,7 +117,7 @@ void tst_textpainter::glyphsAreDrawnOnce()
     Pair pair(record);
     const int green = count(picture(pair.scene), QColor(0, 255, 0));
     QVERIFY(green > 300);
-    // The document's own glyphs stay invisible: nothing of any other colour is there.
+    // The glyphs of the document itself are not painted, so no other colour is found.
     QCOMPARE(count(picture(pair.scene), QColor(0, 0, 0)), 0);
     typeTextAt(*pair.child, 4, "I");
     QVERIFY(count(picture(pair.scene), QColor(0, 255, 0)) > green);
@@ -150,7 +150,7 @@ void tst_textpainter::outlineUnderGlyphs()
     const QImage without = picture(plain.scene);
     QVERIFY(count(with, QColor(255, 0, 0)) > 500);
     QCOMPARE(count(without, QColor(255, 0, 0)), 0);
-    // No outline lies over a glyph, not even over a neighbour's.
+    // No outline covers a glyph, not even that of a neighbour.
     int covered = 0;
     int white = 0;
     for (int y = 0; y < without.height(); ++y) {
@@ -221,7 +221,7 @@ void tst_textpainter::paintedInAViewInsideAWindow()
     Pair pair(record);
     const int whole = count(picture(pair.scene), QColor(255, 255, 255));
     QVERIFY(whole > 500);
-    // What is shown does not depend on where the view stands in its window.
+    // The picture does not depend on the place of the view in its window.
     QWidget window;
     window.setStyleSheet("background-color:black");
     window.resize(1900, 850);

@@ -9,7 +9,7 @@
 
 using namespace TextObjectConstants;
 
-// Where a text object stands and how far it may be moved.
+// The place of a text object, and how far it may be moved.
 class tst_textplacement : public QObject
 {
     Q_OBJECT
@@ -82,7 +82,7 @@ void tst_textplacement::range()
 void tst_textplacement::limits_data()
 {
     QTest::addColumn<QPointF>("wanted");
-    // What of the size is taken off the place, and what is added to the point that the finger drags from.
+    // taken: what is subtracted from the place; reach: what is added to the point from which the finger drags.
     QTest::addColumn<QPointF>("corner");
     QTest::addColumn<QPointF>("taken");
     QTest::addColumn<QPointF>("reach");

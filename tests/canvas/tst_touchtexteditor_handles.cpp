@@ -149,7 +149,7 @@ void tst_touchtexteditor_handles::longPressNeedsEditing()
 void tst_touchtexteditor_handles::grabBesideTheHandle_data()
 {
     QTest::addColumn<QPointF>("offset");
-    // From the top left of the handle of 24 by 27, a hair inside the eight pixels around it.
+    // Offsets from the top left of the handle of 24 by 27 pixels, just inside the margin of eight pixels.
     QTest::newRow("middle") << QPointF(12.0, 13.0);
     QTest::newRow("left") << QPointF(-7.0, 13.0);
     QTest::newRow("right") << QPointF(31.0, 13.0);
@@ -221,12 +221,12 @@ void tst_touchtexteditor_handles::dragOfEachHandle()
     GraphicsText* item = canvas.text(1);
     select(canvas, anchor, position);
     canvas.touchDrag(canvas.handleIn(*item, grabbed), canvas.handleIn(*item, target));
-    // The end that was not touched stays; the finger's end is the one that moves on.
+    // The end that was not touched stays; the end under the finger moves on.
     const int other = grabbed == anchor ? position : anchor;
     QCOMPARE(item->textCursor().anchor(), other);
     QCOMPARE(item->textCursor().position(), target);
     QVERIFY(item->isHandleCaret());
-    // And it can be taken again at once.
+    // The handle can be dragged again immediately.
     canvas.touchDrag(canvas.handleIn(*item, target), canvas.handleIn(*item, grabbed));
     QCOMPARE(item->textCursor().anchor(), other);
     QCOMPARE(item->textCursor().position(), grabbed);
@@ -259,7 +259,7 @@ void tst_touchtexteditor_handles::keyboardHearsOfTheSelection()
     const int calls = int(keyboard.count());
     QVERIFY(calls >= 1);
     QCOMPARE(item->objectName(), QStringLiteral("0#Text Input#1#300##7#2#7#1##300"));
-    // The same selection is not told twice.
+    // The same selection is not reported twice.
     canvas.move(canvas.handleIn(*item, 7) + QPoint(1, 0));
     QCOMPARE(keyboard.count(), calls);
     canvas.release(canvas.handleIn(*item, 7));

@@ -179,7 +179,7 @@ void tst_touchtexteditor_taps::tapOnEmptyCanvas()
     canvas.edit(1, canvas.caretIn(*canvas.text(1), 1));
     QSignalSpy exists(canvas.scene.get(), &CanvasScene::signalSceneNotifyIfExistSelectedObject);
     QSignalSpy pressed(canvas.scene.get(), &CanvasScene::signalCanvasSceneMousePressed);
-    // Within the screen of the test, beyond which no touch finds its window.
+    // The point is on the screen of the test; touches outside of it do not reach a window.
     canvas.touchTap(QPoint(80, 600));
     QCOMPARE(canvas.text(1)->getFocusFlag(), int(TextObjectConstants::FocusNone));
     QCOMPARE(canvas.text(1)->textInteractionFlags(), Qt::NoTextInteraction);
@@ -243,7 +243,7 @@ void tst_touchtexteditor_taps::dragWhileEditingMovesNothing()
     canvas.touchDrag(canvas.caretIn(*item, 1), canvas.caretIn(*item, 3));
     QCOMPARE(item->scenePos(), QPointF(300.0, 200.0));
     QCOMPARE(item->getFocusFlag(), int(TextObjectConstants::FocusEdit));
-    // Without handles there is nothing to drag.
+    // Without handles a drag changes nothing.
     QVERIFY(!item->textCursor().hasSelection());
     QCOMPARE(canvas.stack.count(), 0);
 }
@@ -332,7 +332,7 @@ void tst_touchtexteditor_taps::fingerReturnsFromALimit()
     const QPointF held = item->scenePos();
     const double reach =
         direction.x() != 0 ? item->layoutRect().width() - 100.0 : item->layoutRect().height() - 100.0;
-    // Where the finger has to be before the object comes along.
+    // The position of the finger from which on the object follows.
     const int turn = int((factor - 1.0) * reach);
     const QPoint along = direction.x() != 0 ? QPoint(1, 0) : QPoint(0, 1);
     const QPoint still = direction.x() != 0 ? QPoint(0, from.y()) : QPoint(from.x(), 0);
@@ -426,7 +426,7 @@ void tst_touchtexteditor_taps::cancelledDragPutsTheObjectBack()
     QCOMPARE(item->getItemTText()->getXValue(), 300.0F);
     QCOMPARE(canvas.stack.count(), 0);
     QCOMPARE(canvas.scene->mouseGrabberItem(), nullptr);
-    // A second one has nothing to end.
+    // A second cancel has no effect.
     QTouchEvent again(QEvent::TouchCancel, m_device);
     QCoreApplication::sendEvent(canvas.view.viewport(), &again);
     QCOMPARE(item->getFocusFlag(), int(TextObjectConstants::FocusObject));
@@ -459,7 +459,7 @@ void tst_touchtexteditor_taps::cancelledTapChoosesNothing()
     QVERIFY(keyboard.count() > 0);
 }
 
-// The frame is drawn a little outside the text, where there is nothing to take hold of.
+// The frame is drawn a little outside the text; a press there does not reach the object.
 void tst_touchtexteditor_taps::frameIsNoHandle()
 {
     TouchCanvas canvas(m_device);
@@ -522,7 +522,7 @@ void tst_touchtexteditor_taps::secondFingerOnAButton()
     QCOMPARE(clicked.count(), 0);
     QCOMPARE(canvas.text(1)->scenePos(), QPointF(360.0, 200.0));
     QCOMPARE(canvas.stack.count(), 1);
-    // Once the canvas is free the button works.
+    // The button works after the canvas is released.
     QTest::touchEvent(&canvas.window, m_device).press(1, middle, canvas.button);
     QTest::touchEvent(&canvas.window, m_device).release(1, middle, canvas.button);
     QCOMPARE(clicked.count(), 1);

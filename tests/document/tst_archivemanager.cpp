@@ -168,7 +168,7 @@ private Q_SLOTS:
             names.append(QString::fromStdString(title->getName()));
         qDeleteAll(titles);
         QCOMPARE(names, QStringList({"kept", "inside"}));
-        // A row that is too short for a title takes the other way of reading.
+        // With a row that is too short for a title the list is read in another way.
         setOrder({"x", "../../../elsewhere/foreign.xml", "kept.xml"});
         const QList<Archive*> others = ArchiveController().getArchiveList(m_folder);
         QCOMPARE(others.size(), 1);
@@ -224,7 +224,7 @@ private Q_SLOTS:
         QCOMPARE(!source.getFullPathOfThumbnailSmall().isNull(), isOurs);
         QCOMPARE(!source.getFullPathOfBgResource().isNull(), isOurs);
         QCOMPARE(!source.getFullPathOfBgResourceBig().isNull(), isOurs);
-        // Nor is it copied into the folder of another title.
+        // The picture is not copied into the folder of another title, either.
         Archive target;
         target.setPath(base("titles/other/copy.xml").toStdString());
         target.setThumbnailSmall("small.png");
@@ -256,7 +256,7 @@ private Q_SLOTS:
 
     void theFolderOutlivesItsLastTitle()
     {
-        Archive archive; // names no pictures
+        Archive archive; // without picture names
         archive.setPath(file("last.xml").toStdString());
         ArchiveManager* const manager = ArchiveManager::getInstance();
         QCOMPARE(manager->saveArchive(&archive), 1);
@@ -437,7 +437,7 @@ private Q_SLOTS:
         qDeleteAll(titles);
         setOrder({"a.x"});
         QVERIFY(controller.getArchiveList(m_folder).isEmpty());
-        // A row that cannot be a title does not take the others with it.
+        // A row that cannot be a title does not hide the others.
         setOrder({"a.x", "a.xml", ""});
         const QList<Archive*> others = controller.getArchiveList(m_folder);
         QCOMPARE(others.size(), 2);
@@ -460,7 +460,7 @@ private Q_SLOTS:
         const auto rows = controller.getFileOrder(m_folder);
         QCOMPARE(rows.size(), std::size_t(2));
         QVERIFY(controller.getFileOrder(m_folder + "/none").empty());
-        QCOMPARE(rows[0]->getArchivePath(), std::string("b.xml")); // still there
+        QCOMPARE(rows[0]->getArchivePath(), std::string("b.xml")); // not changed
         QCOMPARE(controller.getTargetFileList(rows, "/f"),
                  std::vector<std::string>({"/f/b.xml", "/f/a.xml"}));
         QCOMPARE(controller.getDeletedFileList(
@@ -560,7 +560,7 @@ private Q_SLOTS:
         QCOMPARE(controller.getFileOrder(m_folder).size(), std::size_t(2));
     }
 
-    // One could not be read again in an order, and with it none of the others.
+    // Such a name would make the order file unreadable, and hide all titles.
     void namesThatAreNotUtf8HideNothing()
     {
         ArchiveController controller;
@@ -574,7 +574,7 @@ private Q_SLOTS:
         const QList<Archive*> titles = controller.getArchiveList(m_folder);
         QCOMPARE(titles.size(), 2);
         qDeleteAll(titles);
-        // Nor does it go with what the order does not name.
+        // The file is not removed with the titles that the order does not list, either.
         setOrder({"b.xml"});
         controller.deleteUnusefulArchives(m_folder);
         QVERIFY(!QFile::exists(file("a.xml")));

@@ -160,7 +160,7 @@ private Q_SLOTS:
         QPainter(&expected).drawImage(0, 0, reduced);
         QCOMPARE(read("small.png"), expected);
 
-        // From memory, with the alpha premultiplied as the renderer has it, the result is that of the file.
+        // A premultiplied picture from memory, as the renderer makes it, gives the same result as the file.
         const QImage rendered = source.convertToFormat(QImage::Format_ARGB32_Premultiplied);
         QVERIFY(resize(rendered));
         const QImage small = read("small.png"), black = read("black.png");
@@ -187,7 +187,7 @@ private Q_SLOTS:
         QVERIFY(target != other);
     }
 
-    // Sizes that do not fit and other formats are no reason to read or write beyond a picture.
+    // With sizes that do not fit, or other formats, nothing is read or written beyond a picture.
     void oddPictures()
     {
         ImageResizer resizer;
@@ -219,11 +219,11 @@ private Q_SLOTS:
         QVERIFY(QFile::exists(m_folder->filePath("black.png")));
         QVERIFY(!QFile::exists(m_folder->filePath("small.png")));
         QVERIFY(resize(pattern(960, 540, QImage::Format_RGB32)));
-        // A checker with a palette is painted on all the same.
+        // A checker picture with a palette can be painted on as well.
         QVERIFY(m_checker.convertToFormat(QImage::Format_Indexed8).save(checkerPath()));
         QVERIFY(resize(transparent));
         QCOMPARE(read("small.png").convertToFormat(QImage::Format_RGB32), m_checker);
-        // One that cannot be read just now is taken as it was.
+        // If the checker picture cannot be read any more, the former one is used.
         QFile torn(checkerPath());
         QVERIFY(torn.resize(20) && QFile::remove(m_folder->filePath("small.png")));
         QVERIFY(resize(transparent));

@@ -211,7 +211,7 @@ private Q_SLOTS:
         QCOMPARE(english[1]->getPath(), userFile("middle/Titler.xml").toStdString());
     }
 
-    // A file named after its folder lets an entry pass the first test, and only the title file the second.
+    // A file named after its folder passes the first check of an entry; only the title file passes the second.
     void titleFileNamedAfterItsFolder()
     {
         makeUserTemplate("a", 100);
@@ -371,7 +371,7 @@ private Q_SLOTS:
         QVERIFY(!QFile::exists(userFile("a")));
         QCOMPARE(manager->deleteTemplatePath(userFile("a/Titler.xml").toStdString()), 0);
         QCOMPARE(rows(), QStringList{"b/Titler.xml"});
-        // A folder whose title file cannot be read goes, too, and the result tells.
+        // A folder whose title file cannot be read is removed, too; the result reports that.
         write(userFile("b/Titler.xml"), "<torn");
         QCOMPARE(manager->deleteTemplatePath(userFile("b//Titler.xml").toStdString()), 0);
         QVERIFY(!QFile::exists(userFile("b")));

@@ -110,7 +110,7 @@ void tst_archiveitem::handleStandsBesideTheText()
         QVERIFY2(!line.intersects(handle->geometry()), qPrintable(label->text()));
         QVERIFY2(fits(*label), qPrintable(label->text()));
     }
-    // What comes while the list is being rearranged keeps off, too.
+    // A text that is set in move mode leaves room for the handle, too.
     show(QStringLiteral("other ").repeated(60));
     for (const QLabel* label : labels())
         QVERIFY2(fits(*label), qPrintable(label->text()));

@@ -149,7 +149,7 @@ void tst_archivelist::opensAFolderInItsOrder()
     QCOMPARE(stems(), (QStringList{QStringLiteral("c"), QStringLiteral("a"), QStringLiteral("b")}));
     QCOMPARE(m_canvas, (QStringList{QStringLiteral("c")}));
     QCOMPARE(m_list->getSelectedArchive(), item(0));
-    // The thumbnails follow by and by.
+    // The thumbnails are loaded later.
     QTRY_VERIFY(item(2)->hasChildWidgets());
     QCOMPARE(textLines(item(2)).front(), QStringLiteral("b"));
     QCOMPARE(ArchiveController().getLastFolderPath(), folder);
@@ -243,7 +243,7 @@ void tst_archivelist::fullFolderRefusesNewTitles()
     const QString folder = m_fixture.makeFolder(QStringLiteral("full"));
     LibraryFixture::fillFolder(folder, numbered(98));
     m_list->refreshArchiveList(folder);
-    QVERIFY(!m_list->checkArchiveListIsFull()); // the 99th can be made
+    QVERIFY(!m_list->checkArchiveListIsFull()); // there is room for a 99th title
     LibraryFixture::fillFolder(folder, numbered(99));
     m_context.createNew = true;
     m_list->refreshArchiveList(folder);
@@ -260,7 +260,7 @@ void tst_archivelist::fullFolderRefusesNewTitles()
     choose(0, ArchiveAction::ACTION_PASTE);
     QCOMPARE(m_messages.take(), (Reports{{113, QStringLiteral("99")}}));
     QCOMPARE(picker.count(), 0);
-    // The picker may be open over a full list, which was saved from.
+    // The picker may still be open when the list is full.
     const auto temp = LibraryFixture::makeRecord(folder, QStringLiteral("t00"), QStringLiteral("text"));
     m_list->createArchiveFromTemplate(temp.get());
     QCOMPARE(m_messages.take(), (Reports{{112, QStringLiteral("99")}}));
@@ -321,7 +321,7 @@ void tst_archivelist::autoInitCanBeInterrupted()
     for (int i = 0; i < 10; ++i) {
         ArchiveController().setLastFolderPath(many);
         ArchiveList list(&label, true);
-        if (i % 2 == 0) // otherwise the list goes while its loader runs
+        if (i % 2 == 0) // otherwise the list is destroyed while its loader runs
             list.refreshArchiveList(folder);
         QCOMPARE(list.count(), i % 2 == 0 ? 3 : 0);
     }
@@ -334,7 +334,7 @@ void tst_archivelist::tapSelectsAndTellsTheCanvas()
     m_canvas.clear();
     tap(2);
     QCOMPARE(m_canvas, (QStringList{QStringLiteral("b")}));
-    QCOMPARE(leaving.count(), 1); // the title before gets its pictures
+    QCOMPARE(leaving.count(), 1); // the pictures of the previous title are made
     QCOMPARE(m_stack.count(), 1);
     QCOMPARE(item(2)->styleSheet(), ArchiveItem::UN_OPERATE_AND_SELECT_STATE);
     QCOMPARE(item(0)->styleSheet(), ArchiveItem::UN_OPERATE_AND_UN_SELECT_STATE);
@@ -348,7 +348,7 @@ void tst_archivelist::tapOnTheSelectedItemChangesNothing()
     m_list->selectOperationArchive(0);
     QCOMPARE(item(0)->styleSheet(), ArchiveItem::OPERATE_AND_SELECT_STATE);
     tap(0);
-    QCOMPARE(item(0)->styleSheet(), ArchiveItem::UN_OPERATE_AND_SELECT_STATE); // but the border
+    QCOMPARE(item(0)->styleSheet(), ArchiveItem::UN_OPERATE_AND_SELECT_STATE); // only the border changes
     QVERIFY(m_canvas.isEmpty());
     QCOMPARE(m_stack.count(), 0);
 }
@@ -459,7 +459,7 @@ void tst_archivelist::saveRefreshesTheItem()
     QCOMPARE(item(1)->getArchiveData()->getName(), std::string("a"));
     const QImage shown = item(1)->grab().toImage();
     QCOMPARE(shown.pixelColor(120, 70), QColor(Qt::green));
-    m_list->refreshBaseItem(folder + QStringLiteral("/unknown.xml"), picture); // nobody's
+    m_list->refreshBaseItem(folder + QStringLiteral("/unknown.xml"), picture); // no title has this path
     m_list->refreshBaseItem(QString(), QImage());
 }
 
@@ -518,7 +518,7 @@ void tst_archivelist::letterTailsAreWhole_data()
     QTest::newRow("a tall family") << "DFHeiW5-A" << QStringLiteral("gjp 快讯");
 }
 
-// A line is as high as it is, whatever the families need that stand in for missing characters.
+// The height of a line does not depend on the fonts that replace missing characters.
 void tst_archivelist::letterTailsAreWhole()
 {
     QFETCH(const QString, family);
@@ -640,7 +640,7 @@ void tst_archivelist::followsARenamedFolder()
     QCOMPARE(m_canvas, (QStringList{QStringLiteral("a")}));
     QCOMPARE(ArchiveController().getLastFolderPath(), after);
     QCOMPARE(m_label->text(), QStringLiteral("after"));
-    QCOMPARE(m_folders.take(), (QStringList{QStringLiteral("start after")})); // the old one is no more
+    QCOMPARE(m_folders.take(), (QStringList{QStringLiteral("start after")})); // the old path does not exist any more
 }
 
 void tst_archivelist::renamedEmptyFolderOffersATemplate()
@@ -657,7 +657,7 @@ void tst_archivelist::renamedEmptyFolderOffersATemplate()
     QCOMPARE(m_list->getCurrentPath(), after);
     QCOMPARE(m_label->text(), QStringLiteral("empty after"));
     QVERIFY(!m_list->getSelectedArchive());
-    QVERIFY(m_canvas.isEmpty()); // it is empty already
+    QVERIFY(m_canvas.isEmpty()); // the canvas was empty before
 }
 
 void tst_archivelist::changeOfFolderIsReported()
@@ -672,7 +672,7 @@ void tst_archivelist::changeOfFolderIsReported()
 
 void tst_archivelist::synchronizationRemovesWhatTheOrderDoesNotName()
 {
-    m_list->synchronizationFolderFile(); // no folder: nothing
+    m_list->synchronizationFolderFile(); // does nothing without a folder
     const QString folder = threeTitles(QStringLiteral("sync"));
     m_list->refreshArchiveList(folder);
     LibraryFixture::writeOrder(folder, {QStringLiteral("c"), QStringLiteral("b")});
@@ -690,7 +690,7 @@ void tst_archivelist::cleaningForgetsTheFolder()
     QVERIFY(m_list->getCurrentPath().isEmpty());
     QVERIFY(m_label->text().isEmpty());
     QVERIFY(!m_list->getSelectedArchive());
-    QCoreApplication::processEvents(); // items whose thumbnails were still to come
+    QCoreApplication::processEvents(); // items whose thumbnails had not been loaded
     QTRY_VERIFY(m_list->findChildren<ArchiveItem*>().isEmpty());
 }
 
@@ -700,7 +700,7 @@ void tst_archivelist::selectionIsScrolledIntoView()
     LibraryFixture::fillFolder(folder, numbered(20));
     m_list->refreshArchiveList(folder);
     m_list->selectArchive(10);
-    QCOMPARE(m_list->firstVisibleItem(), 4); // the selection stands in the 7th row
+    QCOMPARE(m_list->firstVisibleItem(), 4); // the selected title is in the 7th row
     m_list->selectArchive(1);
     QCOMPARE(m_list->firstVisibleItem(), 1);
     m_list->selectArchive(3);

@@ -50,7 +50,7 @@ private:
                    ? QFileInfo(QString::fromStdString(m_scene->archive()->getPath())).completeBaseName()
                    : QString();
     }
-    // As the window does on a template's choice.
+    // Creates a title as the window does when a template is chosen.
     void createTitle(const QString& text)
     {
         const auto temp = LibraryFixture::makeRecord(m_fixture.makeFolder(QStringLiteral("presets")),
@@ -146,10 +146,10 @@ void tst_archivelist_canvas::leavingATextThatIsTypedWritesItsPictures()
     QTRY_VERIFY(m_scene->isEditFinish());
     const QRect ink = inkIn(QImage(folder + QStringLiteral("/a_1920.png")));
     QVERIFY(ink.width() > 200);
-    // The other was only looked at.
+    // The other title was shown but not changed.
     m_list->selectArchive(0);
     QVERIFY(m_scene->isEditFinish());
-    QCOMPARE(QImage(folder + QStringLiteral("/b_1920.png")).size(), QSize(240, 135)); // as it was
+    QCOMPARE(QImage(folder + QStringLiteral("/b_1920.png")).size(), QSize(240, 135)); // not written again
 }
 
 // It is decoded while the copy is held, so a file that changes in between must be noticed.
@@ -226,7 +226,7 @@ void tst_archivelist_canvas::deletedTitleLeavesNoPictures()
         QVERIFY(QFile::exists(folder + QLatin1Char('/') + kept + QLatin1String(suffix)));
 }
 
-// Another process gives the open folder a new name while pictures are on their way; its notice comes later.
+// Another process renames the open folder while pictures are being written; its notice arrives later.
 void tst_archivelist_canvas::picturesFollowTheirFolder()
 {
     const QString before = m_fixture.makeFolder(QStringLiteral("before"));
@@ -244,7 +244,7 @@ void tst_archivelist_canvas::picturesFollowTheirFolder()
         m_scene->slotMakeSceneThumnail();
         QVERIFY(QDir().rename(before, after));
         reporter.goOn.release(1000);
-        QTRY_VERIFY(m_scene->isEditFinish()); // those that went into the void
+        QTRY_VERIFY(m_scene->isEditFinish()); // the pictures for the path that does not exist any more
         createTitle(QStringLiteral("lost with the folder"));
         m_list->refreshArchiveListForChangeFolderName(before, after);
         QTRY_VERIFY(m_scene->isEditFinish());

@@ -129,7 +129,7 @@ void tst_archivelist_commands::deleteOfTheSelectedTitle()
     QVERIFY(item(1)->isVisible());
     QCOMPARE(m_canvas.back(), QStringLiteral("b"));
     QCOMPARE(m_reports.take(), (Reports{{4, QStringLiteral("b")}}));
-    QVERIFY(m_context.files.isEmpty()); // it was not made in this request
+    QVERIFY(m_context.files.isEmpty()); // it was not created by this request
 
     m_stack->redo();
     QCOMPARE(LibraryFixture::order(folder), (Names{QStringLiteral("a"), QStringLiteral("c")}));
@@ -240,7 +240,7 @@ void tst_archivelist_commands::pasteGoesBehindTheOperationItem()
     m_stack->undo();
     QCOMPARE(LibraryFixture::order(folder),
              (Names{QStringLiteral("a"), QStringLiteral("b"), QStringLiteral("c")}));
-    QCOMPARE(selected(), 2); // the one that was selected before
+    QCOMPARE(selected(), 2); // the title that was selected before
     QVERIFY(m_context.files.isEmpty());
     QCOMPARE(m_reports.take(), (Reports{{2, made}}));
     QCOMPARE(m_stack->redoText(), QStringLiteral("PasteArchiveCommand-undo"));
@@ -289,7 +289,7 @@ void tst_archivelist_commands::createByRequestGoesToTheEnd()
                                                  QStringLiteral("p"), QStringLiteral("New"));
     m_list->createArchiveFromTemplate(temp.get());
     QCOMPARE(selected(), 3);
-    m_list->createArchiveFromTemplate(temp.get()); // the operation item is still the last of before
+    m_list->createArchiveFromTemplate(temp.get()); // the operation item is still that of the last command
     QCOMPARE(m_list->count(), 5);
     QCOMPARE(m_context.files.size(), 2);
     QCOMPARE(LibraryFixture::order(folder).size(), 5);
@@ -314,7 +314,7 @@ void tst_archivelist_commands::createFromABlankTemplate()
     m_list->createArchiveFromTemplate(&blank);
     m_list->createArchiveFromTemplate(&blank);
     QCOMPARE(m_list->count(), 2);
-    // The titles and the order, and no picture from nowhere.
+    // The folder holds the titles and the order, but no pictures.
     QCOMPARE(settledEntries(folder).size(), 3);
     QVERIFY(stem(0) != stem(1));
 }
@@ -329,7 +329,7 @@ void tst_archivelist_commands::moveAndBack()
     m_stack->push(new MoveArchiveCommand(m_list.get(), moved, 0, 2));
     const Names after{QStringLiteral("b"), QStringLiteral("c"), QStringLiteral("a")};
     QCOMPARE(LibraryFixture::order(folder), after);
-    QVERIFY(m_folders.take().isEmpty()); // the drag has told it already
+    QVERIFY(m_folders.take().isEmpty()); // the drag has reported it already
     m_stack->undo();
     QCOMPARE(LibraryFixture::order(folder),
              (Names{QStringLiteral("a"), QStringLiteral("b"), QStringLiteral("c")}));
@@ -356,7 +356,7 @@ void tst_archivelist_commands::undoOfAMoveEndsTheOperation()
     m_stack->redo();
     QVERIFY(events.take().isEmpty());
 
-    // The border of the chosen title stays that of the chosen one.
+    // The chosen title keeps its border.
     m_list->selectOperationArchive(0);
     QCOMPARE(item(0)->styleSheet(), ArchiveItem::OPERATE_AND_SELECT_STATE);
     m_stack->undo();

@@ -37,7 +37,7 @@ void cutInHalf(const QString& path)
     write(path, bytes.left(bytes.size() / 2));
 }
 
-// Takes the rights to the folder away, from the superuser, too, who has them in spite of the mode.
+// Makes the folder unreadable, also for the superuser, whom the mode of a folder does not stop.
 class Unreadable
 {
 public:
@@ -213,7 +213,7 @@ void tst_archivelist_folders::orderThatDoesNotFitCostsNoTitle()
         const QByteArray before = read(folder + "/.order.xml");
         const FullDisk disk;
         m->carry(0, 65 + TitleListFixture::ROW);
-        QCOMPARE(read(folder + "/.order.xml"), before); // whole, and nothing beside it
+        QCOMPARE(read(folder + "/.order.xml"), before); // neither torn nor replaced
         m->list->synchronizationFolderFile();
         assertAllThere();
     }
@@ -252,7 +252,7 @@ void tst_archivelist_folders::unreadableOrderCostsNoTitle()
         for (const char* name : {"/a.xml", "/b.xml", "/c.xml"})
             QVERIFY2(QFile::exists(folder + name), name);
     };
-    // While its titles are shown: the list knows their order.
+    // Damaged while its titles are shown: the list still knows the order.
     m->open(folder);
     damage();
     m->list->synchronizationFolderFile();
@@ -276,10 +276,10 @@ void tst_archivelist_folders::skippedTitlesKeepTheirPlaceInTheOrder()
     write(folder + "/picture.png", foreign);
     cutInHalf(folder + "/b.xml");
     m->open(folder);
-    QCOMPARE(LibraryFixture::order(folder), (Names{"a", "b", "c"})); // looking changes nothing
+    QCOMPARE(LibraryFixture::order(folder), (Names{"a", "b", "c"})); // opening a folder does not write its order
     m->list->moveButtonClicked(true);
     m->carry(0, 65 + TitleListFixture::ROW);
-    QCOMPARE(LibraryFixture::order(folder), (Names{"c", "a", "b"})); // what was not shown keeps its place
+    QCOMPARE(LibraryFixture::order(folder), (Names{"c", "a", "b"})); // a title that was not shown keeps its place
     m->list->synchronizationFolderFile();
     for (const char* name : {"/a.xml", "/a_240.png", "/c.xml", "/c_240.png"})
         QVERIFY(QFile::exists(folder + name));
@@ -300,11 +300,11 @@ void tst_archivelist_folders::unreadableFolder()
         QCOMPARE(picker.size(), 1);
         m_messages.take();
         m->hold(TitleListFixture::PICTURE_X, 400);
-        m->choose(ArchiveAction::ACTION_CREATE); // there is no room for a title that can be seen
+        m->choose(ArchiveAction::ACTION_CREATE); // no picker is shown, since a new title could not be shown either
         QCOMPARE(m_messages.take(), (Reports{{114, QStringLiteral("File")}}));
         QCOMPARE(picker.size(), 1);
         Archive blank;
-        m->list->createArchiveFromTemplate(&blank); // refused, which is told, too
+        m->list->createArchiveFromTemplate(&blank); // refused with a message
         QCOMPARE(m_messages.take(), (Reports{{114, QStringLiteral("File")}}));
         QCOMPARE(m->list->count(), 0);
         m->list->synchronizationFolderFile();
@@ -329,7 +329,7 @@ void tst_archivelist_folders::unwritableFolderMakesNoTitle()
     QCOMPARE(m->stack.count(), 0);
     QCOMPARE(pasted.size(), 0);
     QCOMPARE(LibraryFixture::order(folder), m->stems());
-    m->holdAndChoose(1, ArchiveAction::ACTION_PASTE); // and now it can
+    m->holdAndChoose(1, ArchiveAction::ACTION_PASTE); // possible now
     QCOMPARE(m->list->count(), 4);
 }
 
@@ -344,7 +344,7 @@ void tst_archivelist_folders::readOnlyTemplateFolderTakesNoTemplate()
     QSignalSpy picker(m->list, &ArchiveList::startUserTemplatePicker);
     m_messages.take();
     m_reports.take();
-    // Others, and the group that is kept, may reach the title, not the templates.
+    // Other users and the group may read the title, but not the templates.
     const QString root = QDir::cleanPath(m_fixture.titleRoot() + "/../..");
     QVERIFY(QFile::setPermissions(root, QFile::permissions(root) | QFile::ReadGroup | QFile::ExeGroup |
                                             QFile::ReadOther | QFile::ExeOther));
@@ -358,7 +358,7 @@ void tst_archivelist_folders::readOnlyTemplateFolderTakesNoTemplate()
     QCOMPARE(m_reports.take(), Reports());
     QCOMPARE(m->stems(), (Names{"a", "b", "c"}));
     QCOMPARE(QDir(templates).entryList(QDir::AllEntries | QDir::NoDotAndDotDot), Names());
-    m->holdAndChoose(1, ArchiveAction::ACTION_ADD_USER); // and now it can
+    m->holdAndChoose(1, ArchiveAction::ACTION_ADD_USER); // possible now
     QCOMPARE(added.size(), 1);
     QVERIFY(QFile::exists(templates + "/UserTemplate_001/Titler.xml"));
     QDir(templates).removeRecursively();
@@ -399,7 +399,7 @@ void tst_archivelist_folders::badPictures()
     const auto* view = m->item(1)->findChild<QGraphicsView*>();
     const QSize shown = view->scene()->items().constFirst()->boundingRect().size().toSize();
     QVERIFY2(shown.width() <= 240 && shown.height() <= 135, qPrintable(QString::number(shown.width())));
-    // The title itself is as good as any.
+    // The title itself works like any other.
     m->tapTitle(1);
     QCOMPARE(m->takeCanvas(), Names{"b"});
     m->holdAndChoose(1, ArchiveAction::ACTION_COPY);
@@ -417,7 +417,7 @@ void tst_archivelist_folders::folderGoneWhileOpen()
     QVERIFY(QDir(folder).removeRecursively());
 
     m->tapTitle(1);
-    QCOMPARE(m->takeCanvas(), Names{"b"}); // the record is at hand
+    QCOMPARE(m->takeCanvas(), Names{"b"}); // the record is still in memory
     m->holdAndChoose(2, ArchiveAction::ACTION_DELETE);
     QCOMPARE(m->stems(), (Names{"a", "b"}));
     m->stack.undo();
@@ -456,7 +456,7 @@ void tst_archivelist_folders::titleGoneWhileOpen()
 void tst_archivelist_folders::titlesOfOneMoment()
 {
     const QString folder = m_fixture.makeFolder(QStringLiteral("moment"));
-    // Of the same second, and one that only looks like it.
+    // Two names of the same second, and one that only resembles them.
     const Names names{"20260101120000000", "20260101120000001", "20260101120000"};
     LibraryFixture::fillFolder(folder, names);
     m->open(folder);

@@ -132,20 +132,20 @@ void tst_archivelist_fulldisk::orderIsToldOnceAndWrittenWhenThereIsRoom()
         QCOMPARE(waitForMessage(), (Reports{{114, QStringLiteral("File")}}));
         QCOMPARE(read(folder + "/.order.xml"), before);
     }
-    // Nobody does anything.
+    // The order is written again without any action of the operator.
     QTRY_VERIFY(!read(folder + "/.order.xml").contains("\"c.xml\""));
     QCOMPARE(LibraryFixture::order(folder), (Names{"a", "b"}));
     QCOMPARE(m_messages.take(), Reports());
-    // It could not be written for a while: what it does not name stays for now.
+    // The order could not be written for a while, so titles that it does not list are kept.
     m->list->synchronizationFolderFile();
     verifyTitles(folder, {"a", "b", "c"});
-    // Opened anew, it can be trusted again.
+    // After the folder is opened again, the order is trusted again.
     m->stack.clear();
     m->list->refreshArchiveList(folder);
     m->list->synchronizationFolderFile();
     QVERIFY(!QFile::exists(folder + "/c.xml"));
     verifyTitles(folder, {"a", "b"});
-    // The next full disk is told again.
+    // The next full disk is reported again.
     {
         const FullDisk disk;
         m->holdAndChoose(1, ArchiveAction::ACTION_DELETE);
@@ -178,7 +178,7 @@ void tst_archivelist_fulldisk::titlesOfADamagedOrderAreListedByName()
         QVERIFY(QFile::remove(folder + "/.order.xml"));
     m->open(folder);
     QCOMPARE(m->stems(), (Names{"a", "b", "c"}));
-    QCOMPARE(FolderOrder::stateOf(folder.toStdString()), FolderOrder::State::Whole); // written anew
+    QCOMPARE(FolderOrder::stateOf(folder.toStdString()), FolderOrder::State::Whole); // written again
     QCOMPARE(LibraryFixture::order(folder), (Names{"a", "b", "c", "d"}));
 }
 
@@ -192,7 +192,7 @@ void tst_archivelist_fulldisk::folderOfADamagedOrderIsNotCleanedUp()
     m->list->synchronizationFolderFile();
     verifyTitles(folder, {"a", "b", "c"});
     QCOMPARE(LibraryFixture::order(folder), (Names{"a", "c"}));
-    // By nobody else either, while the order is damaged or gone.
+    // No other code removes titles either while the order is damaged or missing.
     for (const bool isGone : {false, true}) {
         write(folder + "/.order.xml", "<manifest");
         if (isGone)
@@ -241,7 +241,7 @@ void tst_archivelist_fulldisk::titleThatCouldNotBeReadForAMomentStays()
     const QString folder = abc(QStringLiteral("for a moment"));
     const QString title = folder + "/b.xml";
     QVERIFY(QFile::rename(title, folder + "/b.bak"));
-    QVERIFY(QDir().mkdir(title)); // there, but it gives no bytes
+    QVERIFY(QDir().mkdir(title)); // exists, but cannot be read
     m->open(folder);
     QCOMPARE(m->stems(), (Names{"a", "c"}));
     QVERIFY(QDir().rmdir(title));

@@ -72,7 +72,7 @@ private:
         if (m_pattern.isEmpty())
             makePattern();
         QDir().mkpath(folder);
-        // Links are quick to make, and all who write replace the file.
+        // Hard links are made quickly and are safe, since files are replaced, not written to.
         for (const QString& name : QDir(m_pattern).entryList(QDir::Files))
             ::link(qPrintable(m_pattern + '/' + name), qPrintable(folder + '/' + name));
         QFile::copy(m_pattern + "/.order.xml", folder + "/.order.xml");
@@ -103,7 +103,7 @@ private:
         QVERIFY(file.open(QIODevice::WriteOnly));
         file.write("<manifest><meta-bg");
     }
-    // Waits for nothing.
+    // Opens a long folder without waiting until its titles are read.
     QString openLong()
     {
         const QString folder = makeFolder();
@@ -112,7 +112,7 @@ private:
         m_folders.take();
         return folder;
     }
-    // Without making items.
+    // Returns the names without making items.
     Names listed() const
     {
         Names result;
@@ -295,7 +295,7 @@ void tst_archivelist_longfolder::unreadableTitlesAboveTheView()
     for (int number = 120; number < 180; number += 2)
         spoil(folder, number);
     m->list->refreshArchiveList(folder);
-    m->list->selectArchive(300); // before all are read, or after: the same title stays in view
+    m->list->selectArchive(300); // the same title stays in view whether all titles have been read or not
     const QString selected =
         QFileInfo(m->list->getSelectedArchive()->getArchiveDataPath()).completeBaseName();
     const int top = m->list->getSelectedArchive()->mapTo(m->list, QPoint()).y();
@@ -381,7 +381,7 @@ void tst_archivelist_longfolder::opensAnUnreadableTitleFarDown()
     QCOMPARE(m->takeCanvas(), Names{stem(0)});
     QCOMPARE(m->selected(), 0);
     QTRY_COMPARE(listed(), without({350}));
-    QCOMPARE(LibraryFixture::order(folder), stems()); // only what is saved changes it
+    QCOMPARE(LibraryFixture::order(folder), stems()); // only saving changes the order file
 }
 
 void tst_archivelist_longfolder::blankRowFarDown()
@@ -442,7 +442,7 @@ void tst_archivelist_longfolder::fullFolderTakesNoNewTitle()
     QCOMPARE(m->list->count(), TITLES);
 }
 
-// The limit counts titles, not rows of which nothing is left.
+// The limit counts titles, not rows whose files have been removed.
 void tst_archivelist_longfolder::manyUnreadableLeaveRoom()
 {
     const QString folder = makeFolder();
@@ -508,7 +508,7 @@ void tst_archivelist_longfolder::languageReachesLateItems()
     m->list->setSystemLanFont(QStringLiteral("KST"));
 }
 
-// The way of a list that opens the last folder when it is made.
+// Loads the folder as a list does that opens the last folder in its constructor.
 void tst_archivelist_longfolder::loadedByTheThread()
 {
     const QString folder = makeFolder();

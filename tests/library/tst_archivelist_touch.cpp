@@ -115,7 +115,7 @@ void tst_archivelist_touch::tapSelects()
     QCOMPARE(m->takeCanvas(), Names{"t02"});
     QCOMPARE(m->selected(), 2);
     QCOMPARE(m->stack.count(), 1);
-    m->tapTitle(2); // again: nothing
+    m->tapTitle(2); // a second tap does nothing
     QCOMPARE(m->takeCanvas(), Names());
     QCOMPARE(m->stack.count(), 1);
     m->tap(List::TEXT_X, 60);
@@ -162,7 +162,7 @@ void tst_archivelist_touch::holdOnEmptyAreaOffersCreateAndPaste()
     QCOMPARE(enabledActions(), (Names{"Create New", "Paste"}));
     m->choose(ArchiveAction::ACTION_PASTE);
     QCOMPARE(m->list->count(), 3);
-    QCOMPARE(m->selected(), 2); // behind the last one
+    QCOMPARE(m->selected(), 2); // below the last title
 }
 
 void tst_archivelist_touch::motionCancelsTheHold()
@@ -175,7 +175,7 @@ void tst_archivelist_touch::motionCancelsTheHold()
     m->release(List::PICTURE_X, 221);
 
     m->press(List::PICTURE_X, 200);
-    m->move(List::PICTURE_X, 220); // within the room of a tap
+    m->move(List::PICTURE_X, 220); // within the tolerance of a tap
     m->clock.advance(List::HOLD_TIME);
     QVERIFY(m->list->IsOptionMenuShowing());
     m->release(List::PICTURE_X, 220);
@@ -267,7 +267,7 @@ void tst_archivelist_touch::brakeSelectsNothing()
     QVERIFY(m->list->isAutoFilck());
     m->press(List::PICTURE_X, 500);
     const int braked = m->value();
-    m->clock.advance(2000); // nor does it become a hold
+    m->clock.advance(2000); // and not a hold either
     m->release(List::PICTURE_X, 500);
     QCOMPARE(m->value(), braked);
     QCOMPARE(m->takeCanvas(), Names());
@@ -280,10 +280,10 @@ void tst_archivelist_touch::copyPasteAndDelete()
 {
     const QString folder = openFolder(QStringLiteral("copy"), 3);
     m->holdAndChoose(1, ArchiveAction::ACTION_COPY);
-    QCOMPARE(m->item(1)->styleSheet(), ArchiveItem::OPERATE_AND_UN_SELECT_STATE); // the border stays
+    QCOMPARE(m->item(1)->styleSheet(), ArchiveItem::OPERATE_AND_UN_SELECT_STATE); // the border is kept
     m->holdAndChoose(1, ArchiveAction::ACTION_DELETE);
     QCOMPARE(m->stems(), (Names{"t00", "t02"}));
-    QVERIFY(QFile::remove(folder + "/t01.xml")); // the copy needs its source no more
+    QVERIFY(QFile::remove(folder + "/t01.xml")); // the copy does not need its source
     QVERIFY(QFile::remove(folder + "/t01_240.png"));
     m->holdAndChoose(0, ArchiveAction::ACTION_PASTE);
     QCOMPARE(m->list->count(), 3);
@@ -322,11 +322,11 @@ void tst_archivelist_touch::saveAsTemplate()
     QCOMPARE(saved.getBgResource(), std::string("Titler_source_1280.png"));
     QCOMPARE(QImage(made + "/Titler_source_1280.png").size(), QSize(64, 36));
     QCOMPARE(QImage(made + "/Titler_240.png").size(), QSize(240, 135));
-    QCOMPARE(m->stems(), numbered(3)); // the list is as it was
+    QCOMPARE(m->stems(), numbered(3)); // the list has not changed
     QCOMPARE(m->stack.count(), 0);
 
-    LibraryFixture::writeOrder(templateRoot(), {name + "/Titler"}); // as the templates' own list does
-    m->holdAndChoose(0, ArchiveAction::ACTION_ADD_USER);            // the selected one
+    LibraryFixture::writeOrder(templateRoot(), {name + "/Titler"}); // as the list of templates writes it
+    m->holdAndChoose(0, ArchiveAction::ACTION_ADD_USER);            // the selected title
     QCOMPARE(added.at(1).at(0).toString(), QStringLiteral("UserTemplate_002"));
     QCOMPARE(m->selected(), 0);
 }
@@ -381,7 +381,7 @@ void tst_archivelist_touch::carryDown()
     QCOMPARE(LibraryFixture::order(folder), m->stems());
     QCOMPARE(m_folders.take(), Names{"order down"});
     QCOMPARE(m->stack.count(), 1);
-    QCOMPARE(m->selected(), 1); // the title on the canvas is the same
+    QCOMPARE(m->selected(), 1); // the same title is on the canvas
     QCOMPARE(m->item(1)->styleSheet(), ArchiveItem::OPERATE_AND_SELECT_STATE);
 
     m->stack.undo();
@@ -422,9 +422,9 @@ void tst_archivelist_touch::carryToTheSamePlace()
     m->carry(1, List::ROW + 70);
     QCOMPARE(m->stems(), numbered(4));
     QCOMPARE(m->stack.count(), 0);
-    QCOMPARE(LibraryFixture::order(folder), numbered(4)); // it was saved all the same
+    QCOMPARE(LibraryFixture::order(folder), numbered(4)); // the order was saved although it is the same
     QCOMPARE(m_folders.take(), Names{"order same"});
-    // A handle that is left at once lifts nothing.
+    // A short tap on a handle does not lift the title.
     m->tap(List::HANDLE_X, 65);
     QCOMPARE(m->stems(), numbered(4));
     QVERIFY(!m->list->getMoveState());
@@ -469,7 +469,7 @@ void tst_archivelist_touch::moveModeNeitherSelectsNorOpensTheMenu()
     moveMode(false);
     m->press(List::HANDLE_X, 65);
     m->clock.advance(List::LIFT_TIME);
-    QVERIFY(!m->list->getMoveState()); // without the mode a handle is nothing
+    QVERIFY(!m->list->getMoveState()); // handles do nothing outside of move mode
     m->release(List::HANDLE_X, 65);
 }
 
@@ -517,7 +517,7 @@ void tst_archivelist_touch::closingTheFolderWhileCarrying()
     m->release(List::HANDLE_X, 500);
     QVERIFY(m->list->isEmpty());
     QVERIFY(!m->isLocked());
-    QCOMPARE(LibraryFixture::order(folder), numbered(4)); // nothing was dropped
+    QCOMPARE(LibraryFixture::order(folder), numbered(4)); // the title was not moved
     m->open(folder);
     QCOMPARE(m->stems(), numbered(4));
 }
@@ -601,7 +601,7 @@ void tst_archivelist_touch::titleGoneFromUnderTheFinger()
     m->press(List::PICTURE_X, List::ROW + 60);
     QVERIFY(m->isLocked());
     change(folder);
-    QVERIFY(!m->isLocked()); // at once, whether the finger is still there or not
+    QVERIFY(!m->isLocked()); // immediately, whether the finger is still down or not
     m->takeCanvas();
     m->move(List::PICTURE_X, List::ROW + 90);
     m->release(List::PICTURE_X, List::ROW + 60);
@@ -635,7 +635,7 @@ void tst_archivelist_touch::ninetyNineTitles()
     m->stack.undo();
     QCOMPARE(m->list->count(), 99);
     QCOMPARE(LibraryFixture::order(folder), m->stems());
-    // From one end to the other.
+    // Scrolls from one end to the other.
     m->list->moveToWidgetItem(98);
     QCOMPARE(m->value(), m->maximum());
     m->tap(List::PICTURE_X, 940);

@@ -114,7 +114,7 @@ void tst_archivemenu::siblingsHearOfTheMenuOnce()
 {
     QFETCH(Closing, closing);
     openFolder(QStringLiteral("events"), 6);
-    for (int round = 0; round < 2; ++round) { // the link is looked for at the first menu only
+    for (int round = 0; round < 2; ++round) { // the link is only looked for when the first menu opens
         QCOMPARE(m_events->take(), Events());
         m->hold(List::PICTURE_X, 200);
         QVERIFY(m->list->IsOptionMenuShowing());
@@ -134,7 +134,7 @@ void tst_archivemenu::requestToGiveWayWithoutAMenuIsNothing()
     Q_EMIT m_events->signalRestoreOriginal();
     m->list->slotHideOptionMenu();
     QCOMPARE(m_events->take(), Events());
-    // Without a link the menu is this process' own.
+    // Without a link the menu is this process's own.
     m_events.reset();
     m->hold(List::PICTURE_X, 60);
     QVERIFY(m->list->IsOptionMenuShowing());
@@ -188,13 +188,13 @@ void tst_archivemenu::choiceOnEmptyAreaIsLoggedWithTheLastTitle()
     QCOMPARE(newLogLines(), Names{QStringLiteral("[Thumbnail] 200: Select  Create New in the 2 Thumbnail")});
 }
 
-// It leaves the canvas for a moment to be written out, which is nothing that the operator did.
+// The title leaves the canvas for a moment while it is saved, which is not an action of the operator.
 void tst_archivemenu::savingTheShownTitleSelectsNothing()
 {
     openFolder(QStringLiteral("shown"), 20);
     m->list->setFixedSize(549, 900);
     m->list->selectArchive(7);
-    m->list->verticalScrollBar()->setValue(120); // the lower edge cuts the title
+    m->list->verticalScrollBar()->setValue(120); // the title is cut at the lower edge
     newLogLines();
     m->takeCanvas();
     QSignalSpy leaving(m->list, &ArchiveList::itemSetDefaultState);

@@ -179,7 +179,7 @@ private Q_SLOTS:
         QVERIFY(disk.createFolder(root(), name));
         QVERIFY(QFileInfo(path(name)).isDir());
         QVERIFY(disk.isNullDirectory(QFileInfo(path(name))));
-        QVERIFY(!disk.createFolder(root(), name)); // it is there
+        QVERIFY(!disk.createFolder(root(), name)); // it exists already
     }
 
     void makesNothingElsewhere()
@@ -265,7 +265,7 @@ private Q_SLOTS:
         QFile::setPermissions(path("locked"), QFileDevice::Permissions());
         QFile::setPermissions(root(), QFileDevice::ReadOwner | QFileDevice::ExeOwner |
                                           QFileDevice::ReadOther | QFileDevice::ExeOther);
-        // Root may do everything; the rights of another user hold for file systems.
+        // Root may write everywhere, so the test takes the file system rights of another user.
         const bool isRoot = geteuid() == 0;
         if (isRoot)
             setfsuid(65534);
@@ -292,7 +292,7 @@ private Q_SLOTS:
     {
         QTest::addColumn<QByteArray>("remain");
         QTest::addColumn<bool>("full");
-        // In bytes, of which 1,000 are a kilobyte; one less than the limit of 200,000 is full.
+        // The room is in bytes, 1,000 to a kilobyte. The disk counts as full below 200,000 kilobytes.
         QTest::newRow("none") << QByteArray("0") << true;
         QTest::newRow("199,999") << QByteArray("199999000") << true;
         QTest::newRow("200,000") << QByteArray("200000000") << false;
@@ -403,7 +403,7 @@ private Q_SLOTS:
         QVERIFY(!factory.hasChildNode(none));
         QVERIFY(!factory.hasChildNode(factory.getChildNode(gaps)));
         QCOMPARE(factory.getNodeInfo(factory.getChildNode(gaps)).fileName(), QStringLiteral("t3.xml"));
-        // What was found holds until the folder is read anew.
+        // The result is kept until the folder is read again.
         LibraryFixture::fillFolder(path("none"), {"t1"});
         QVERIFY(!factory.hasChildNode(none));
         factory.takeFolder("none");
@@ -433,7 +433,7 @@ private Q_SLOTS:
         factory.importSourceData();
         QCOMPARE(factory.getNextNode(b), nullptr);
         QCOMPARE(factory.getChildNode(b), nullptr);
-        // The new name of the one was the old name of the other.
+        // The folder gets the name that the other folder had before.
         factory.renameFolder("c", "b");
         QVERIFY(QDir(root()).rename("c", "b"));
         factory.importSourceData();

@@ -70,7 +70,7 @@ private Q_SLOTS:
         QCOMPARE(sizeLabel()->text(), QString());
     }
 
-    // The frame's line is the last but seven columns.
+    // The line of the frame is seven columns before the last one.
     void nothingTouchesTheFrame()
     {
         f.open();
@@ -321,7 +321,7 @@ private Q_SLOTS:
         f.tapButton("newFolderButton");
         f.enter();
         QCOMPARE(f.folders(), QStringList{"Untitled"});
-        // An empty name falls back on it.
+        // An empty name is replaced by the former one.
         f.tapButton("newFolderButton");
         f.enter("x");
         f.hold("x");
@@ -379,14 +379,14 @@ private Q_SLOTS:
         QCOMPARE(f.messages.take(), (Reports{{115, QStringLiteral("folder")}}));
         QVERIFY(!f.picker->editor());
         QCOMPARE(f.names(), QStringList{"news"});
-        // Enough for an empty folder, not for another like this one.
+        // There is room for an empty folder, but not for a copy of this one.
         qputenv("K2SYS_FS_REMAIN", "200000000");
         f.tapButton("duplicateFolderButton");
         QCOMPARE(f.messages.take(), (Reports{{115, QStringLiteral("folder")}}));
         f.tapButton("newFolderButton");
         QVERIFY(f.picker->editor());
         f.escape();
-        // A name takes no room.
+        // A rename needs no room.
         qputenv("K2SYS_FS_REMAIN", "0");
         f.hold("news");
         f.enter("later");
@@ -432,7 +432,7 @@ private Q_SLOTS:
         QCOMPARE(f.messages.take(), Reports());
         QCOMPARE(f.folders(), QStringList{"NEWS"});
         QCOMPARE(f.names(), QStringList{"NEWS"});
-        // The same name, untouched.
+        // The name is accepted without a change.
         f.hold("NEWS");
         f.enter();
         QCOMPARE(f.folders(), QStringList{"NEWS"});
@@ -464,7 +464,7 @@ private Q_SLOTS:
         f.input()->sendInputStringOnTextChanged((twenty + "n").toStdWString());
         QCOMPARE(f.limits(), QList<int>{4002});
         QCOMPARE(f.service->limits.size(), 0);
-        // The field has not changed, and Enter takes nothing of a text that was refused.
+        // The field keeps its text, and Enter does not accept the text that was refused.
         QCOMPARE(f.picker->editor()->text(), QStringLiteral("news"));
         f.enter(twenty + "n");
         QVERIFY(f.picker->editor());
@@ -489,7 +489,7 @@ private Q_SLOTS:
             QCOMPARE(f.picker->editor()->text(), QStringLiteral("news"));
         }
         QCOMPARE(f.folders(), QStringList{"news"});
-        // A name that is refused is not left behind: the keyboard comes up again.
+        // The editor stays open with a refused name: the keyboard is shown again.
         f.service->calls.clear();
         f.closeKeyboard();
         QVERIFY(f.picker->editor());
@@ -515,7 +515,7 @@ private Q_SLOTS:
         QVERIFY(!f.picker->editor());
         QVERIFY(!f.isEditable("open"));
         QCOMPARE(f.reports.take(), QStringList());
-        // The other one is open now.
+        // The other folder is open now.
         f.picker->setCurrentFolderName("news");
         QVERIFY(f.isEditable("open"));
         QVERIFY(!f.isEditable("news"));
@@ -548,11 +548,11 @@ private Q_SLOTS:
         QVERIFY(!f.picker->editor());
         QCOMPARE(f.current(), QStringLiteral("sports"));
         QCOMPARE(f.folders(), QStringList({"2", "sports"})); // the name was selected
-        // The editor itself is worked by the finger.
+        // A finger can be used in the editor.
         f.hold("sports");
         f.tap(f.picker->editor(), QPoint(20, 20));
         QVERIFY(f.picker->editor());
-        // Buttons end it first.
+        // A button ends the edit before it acts.
         f.type("2");
         f.tapButton("newFolderButton");
         QVERIFY(f.picker->editor());
@@ -575,7 +575,7 @@ private Q_SLOTS:
         FolderEditor* editor = f.picker->editor();
         QVERIFY(editor);
         QCOMPARE(f.folders(), QStringList({"news", "sports"}));
-        // While the box is up, the tree takes no finger, and nothing else ends the edit.
+        // While the message is shown, the tree ignores touches, and the edit does not end.
         f.tap("sports");
         QCOMPARE(f.picker->editor(), editor);
         QCOMPARE(f.current(), QStringLiteral("Untitled"));
@@ -583,7 +583,7 @@ private Q_SLOTS:
         f.tapButton("duplicateFolderButton");
         QCOMPARE(f.picker->editor(), editor);
         QCOMPARE(f.messages.take(), Reports());
-        // The answer to another box is none to this one.
+        // An answer to another message is ignored.
         MessageDefine::tagCloseParam other;
         other.messageId = MessageDef::MESSAGE_CONFIRM_CLOSE;
         Q_EMIT f.messages.signalCloseMessage(other);
@@ -674,7 +674,7 @@ private Q_SLOTS:
         f.escape();
         QTRY_COMPARE(f.names(), QStringList{"a"});
         QCOMPARE(f.folders(), QStringList{"a"});
-        // What was copied is chosen again.
+        // The folder that was copied is selected again.
         QCOMPARE(f.current(), QStringLiteral("a"));
         QCOMPARE(f.buttons(), QStringLiteral("++++"));
     }
@@ -683,7 +683,7 @@ private Q_SLOTS:
     {
         f.make("a", {"t1"});
         f.open();
-        f.make("later", {"t9"}); // without a word
+        f.make("later", {"t9"}); // without a notice
         f.tap("a");
         f.tapButton("duplicateFolderButton");
         f.enter("later");

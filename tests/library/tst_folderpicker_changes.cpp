@@ -43,14 +43,14 @@ private Q_SLOTS:
         f.picker->updateTreeView();
         QCOMPARE(f.names(), QStringList({"a", "b", "c", "inside"}));
         QCOMPARE(f.names(f.row("a")), QStringList({"t1", "t2"}));
-        // One that becomes a link while it is listed goes when it is used.
+        // A folder that is replaced by a link while it is listed is removed from the list when it is tapped.
         QVERIFY(QDir(f.path("c")).removeRecursively() && QFile::link(outside, f.path("c")));
         QSignalSpy folder(f.picker.get(), &FolderPicker::changeFolderPath);
         f.tap("c");
         f.tapButton("openFolderButton");
         QVERIFY(folder.isEmpty());
         QCOMPARE(f.names(), QStringList({"a", "b", "inside"}));
-        // Nor does a notice lead there.
+        // A notice about a link is ignored, too.
         QSignalSpy renamed(f.picker.get(), &FolderPicker::folderNameChange);
         f.picker->setCurrentFolderName(QStringLiteral("a"));
         renameOutside("b", "d");
@@ -58,7 +58,7 @@ private Q_SLOTS:
         notify("a", "link");
         QVERIFY(renamed.isEmpty());
         QCOMPARE(f.names(), QStringList({"a", "d", "inside"}));
-        // What links bring in is not copied.
+        // Files behind links are not copied.
         f.tap("a");
         f.tapButton("duplicateFolderButton");
         f.enter("copy");
@@ -132,7 +132,7 @@ private Q_SLOTS:
         QVERIFY(f.picker->editor());
         QCOMPARE(f.picker->editor()->text(), QStringLiteral("b"));
         QCOMPARE(f.names(), QStringList({"later", "b", "c"}));
-        // The new name of the other is in use now, the old one free.
+        // The new name of the other folder is in use now, its old name is free.
         f.enter("LATER");
         QCOMPARE(f.messages.take(), (Reports{{47, QStringLiteral("LATER")}}));
         f.answerClash();
@@ -173,7 +173,7 @@ private Q_SLOTS:
         QCOMPARE(change.count(), 1);
         QCOMPARE(change.at(0).at(0).toString(), f.path("a"));
         QCOMPARE(change.at(0).at(1).toString(), f.path("later"));
-        // The steps back speak of paths that are no more.
+        // The undo steps are dropped, since their paths do not exist any more.
         QCOMPARE(clear.count(), 1);
         QCOMPARE(f.picker->currentFolderName(), QStringLiteral("later"));
         QVERIFY(!f.isEditable("later"));
@@ -317,12 +317,12 @@ private Q_SLOTS:
         f.tapButton("duplicateFolderButton");
         deleteOutside("a");
         f.enter("copy");
-        // There was nothing to copy.
+        // The source of the copy does not exist any more.
         QVERIFY(!f.picker->editor());
         QVERIFY(!QFileInfo::exists(f.path("copy")));
         QCOMPARE(f.titles.take(), Reports());
         QCOMPARE(f.messages.take(), (Reports{{115, QStringLiteral("folder")}}));
-        // The row that stands for no folder goes with the editor.
+        // The row without a folder is removed together with the editor.
         QTRY_COMPARE(f.names(), QStringList({"b", "c"}));
         QVERIFY(f.picker->isVisible());
     }
@@ -386,7 +386,7 @@ private Q_SLOTS:
         QCOMPARE(f.picker->currentFolderName(), QStringLiteral("A"));
         QCOMPARE(f.names(), QStringList({"A", "b", "c"}));
         QVERIFY(!f.isEditable("A"));
-        // With the other one gone, the name can mean none but the open folder.
+        // After the other folder is renamed, only the open folder can be meant.
         QVERIFY(QDir(f.root()).rename("A", "new"));
         notify("a", "new");
         QCOMPARE(f.picker->currentFolderName(), QStringLiteral("new"));
@@ -437,7 +437,7 @@ private Q_SLOTS:
     void anImportTakesTheNameThatIsBeingMade()
     {
         f.tapButton("newFolderButton");
-        f.make("new", {"t9"}); // without a word
+        f.make("new", {"t9"}); // without a notice
         f.enter("new");
         QVERIFY(!f.picker->editor());
         QCOMPARE(f.names(), QStringList({"a", "b", "c", "new"}));
@@ -460,7 +460,7 @@ private Q_SLOTS:
 
     // --- All of it, in any order ----------------------------------------------------------------------
 
-    // Whatever was done: what is on the disk is listed, and nothing is half open.
+    // After any order of actions the tree lists what is on the disk, and no edit is left half open.
     void inAnyOrder_data()
     {
         QTest::addColumn<quint32>("usualSeed");
@@ -494,7 +494,7 @@ private Q_SLOTS:
             QVERIFY2(names.size() - folders.size() <= 1 + m_refused,
                      qPrintable(done + ": " + names.join('|')));
         }
-        // Read anew, it is the disk exactly.
+        // After it is read again, the tree equals the disk.
         f.picker->updateTreeView();
         QCoreApplication::processEvents();
         QStringList names = f.names();
@@ -555,7 +555,7 @@ private:
             break;
         case 12:
             if (folders.size() > 3) {
-                // A copy whose source goes leaves a row without a folder.
+                // If the source of a copy is deleted, a row without a folder remains.
                 m_refused += f.picker->editAction() == FolderPicker::FOLDER_EDIT_DUPLICATE ? 1 : 0;
                 deleteOutside(folder);
             }
@@ -595,7 +595,7 @@ private:
     }
     QLabel* thumbnail() const { return f.picker->findChild<QLabel*>("folderThumbnail"); }
 
-    int m_refused = 0; // rows that may stand for no folder
+    int m_refused = 0; // rows that may have no folder
     FolderPickerFixture f;
 };
 

@@ -21,7 +21,7 @@ private Q_SLOTS:
     {
         f.make("news");
         f.open();
-        f.make("later"); // without a word
+        f.make("later"); // without a notice
         f.hold("news");
         f.enter("later");
         QVERIFY(!f.picker->editor());
@@ -35,7 +35,7 @@ private Q_SLOTS:
     {
         f.make("news");
         f.open();
-        QFile file(f.path("later")); // without a word
+        QFile file(f.path("later")); // without a notice
         QVERIFY(file.open(QIODevice::WriteOnly));
         f.tap("news");
         f.tapButton("newFolderButton");
@@ -53,11 +53,11 @@ private Q_SLOTS:
         f.tap("news");
         f.tapButton("duplicateFolderButton");
         {
-            const FileSizeLimit limit(64); // as a disk that is full
+            const FileSizeLimit limit(64); // like a full disk
             f.enter("copy");
         }
         QVERIFY(!f.picker->editor());
-        // Half a copy would pass for a whole one.
+        // An incomplete copy would look like a complete one, so it is removed.
         QCOMPARE(f.folders(), QStringList{"news"});
         QCOMPARE(LibraryFixture::order(f.path("news")), QStringList({"a", "b"}));
         QCOMPARE(f.titles.take(), Reports());

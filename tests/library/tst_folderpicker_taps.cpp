@@ -44,7 +44,7 @@ private Q_SLOTS:
         QCOMPARE(f.buttons(), QStringLiteral("++++"));
         QVERIFY(!thumbnail()->isVisible());
         QCOMPARE(sizeLabel()->text(), QString());
-        // Opened again, the folder goes on being the chosen one.
+        // The folder stays selected when it is opened again.
         tapMark("news");
         QCOMPARE(f.current(), QStringLiteral("news"));
         QCOMPARE(f.buttons(), QStringLiteral("++++"));
@@ -73,7 +73,7 @@ private Q_SLOTS:
         QCOMPARE(f.picker->editor()->text(), QStringLiteral("sports"));
     }
 
-    // A title that becomes the chosen one opens its folder, and stays chosen.
+    // A title that is selected opens its folder, and stays selected.
     void openingTheFolderOfTheChosenTitle()
     {
         f.make("news", {"t1", "t2"});
@@ -310,12 +310,12 @@ private Q_SLOTS:
         f.touch->move(f.picker.get(), date);
         f.touch->lift(f.picker.get(), date);
         QCOMPARE(fileList(), QStringList());
-        // The program itself.
+        // Sorting by the program reports nothing.
         f.tree()->sortByColumn(FolderPickerFactory::NameColumn, Qt::DescendingOrder);
         QCOMPARE(f.names(), QStringList({"b", "a"}));
         f.picker->updateTreeView();
         QCOMPARE(fileList(), QStringList());
-        // Under the box that tells of a name in use the header takes no finger.
+        // While the message about a name in use is shown, the header ignores touches.
         f.tapButton("newFolderButton");
         f.enter("a");
         QCOMPARE(f.messages.take(), (Reports{{47, QStringLiteral("a")}}));

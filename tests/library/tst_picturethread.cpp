@@ -18,7 +18,7 @@ QList<QImage> pictures(const QColor& colour)
     return {big, big.scaled(960, 540)};
 }
 
-// Tells when the last copy of it is gone.
+// Releases the semaphore when the last copy of the picture is destroyed.
 QImage watchedPicture(QSemaphore& gone)
 {
     static uchar pixels[16 * 16 * 4] = {};
@@ -231,7 +231,7 @@ void tst_picturethread::deletedTitleKeepsNoPictures()
     thread.addArchive(isBeingWritten ? gone.get() : kept.get(), pictures(Qt::red));
     thread.addArchive(isBeingWritten ? kept.get() : gone.get(), pictures(Qt::red));
     QVERIFY(reporter.reached.tryAcquire(1, 20000));
-    // As the clean-up does it; pictures that come in after this are nobody's.
+    // Removes the files as the clean-up does; pictures written later would belong to no title.
     QVERIFY(QFile::remove(folder + QStringLiteral("/gone.xml")));
     if (!isBeingWritten)
         QVERIFY(QFile::remove(folder + QStringLiteral("/gone_240.png")));

@@ -20,7 +20,7 @@ private Q_SLOTS:
 private:
     static constexpr QSize BOUNDS{240, 135};
 
-    // Pictures whose red tells their place.
+    // Makes pictures whose red is their index.
     QStringList makePictures(int count, QSize size) const
     {
         QStringList paths;
@@ -42,7 +42,7 @@ void tst_smallpictures::eachPictureComesAtItsPlace()
     QCOMPARE(pictures.count(), 60);
     for (int i = 0; i < 60; ++i)
         QCOMPARE(pictures.take(i).pixelColor(3, 3), QColor(i, 10, 10));
-    QVERIFY(pictures.take(7).isNull()); // each once
+    QVERIFY(pictures.take(7).isNull()); // each picture can be taken once
     QVERIFY(pictures.take(-1).isNull());
     QVERIFY(pictures.take(60).isNull());
 }

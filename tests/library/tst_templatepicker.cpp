@@ -96,7 +96,7 @@ private Q_SLOTS:
         m_picker->reloadTemplates(SystemSetupDef::emSystemLanguageEnglish);
         QCOMPARE(names(presets()), QStringList({"lower", "strap"}));
         tapItem(presets(), 1);
-        // The same language again reads nothing: the choice stays.
+        // Setting the same language again does not read the templates again, so the selection is kept.
         TemplateItem* chosen = presets()->selectedItem();
         m_picker->reloadTemplates(SystemSetupDef::emSystemLanguageEnglish);
         QCOMPARE(presets()->selectedItem(), chosen);
@@ -104,7 +104,7 @@ private Q_SLOTS:
         QCOMPARE(names(presets()), QStringList({"xia"}));
         QVERIFY(!presets()->selectedItem());
         QVERIFY(!button("selectPresetButton")->isEnabled());
-        // Each set knows its last choice.
+        // Each set remembers its last selection.
         tapItem(presets(), 0);
         m_picker->reloadTemplates(SystemSetupDef::emSystemLanguageEnglish);
         QCOMPARE(presets()->selectedItem(), presets()->item(1));
@@ -204,7 +204,7 @@ private Q_SLOTS:
         QTRY_VERIFY(!m_picker->isVisible());
         QCOMPARE(m_picker->result(), int(QDialog::Accepted));
 
-        // The choice is kept by the open program and by the next one.
+        // The selection is kept in this process and in the next one.
         QCOMPARE(presets()->selectedItem(), presets()->item(2));
         TemplateManager::cleanUp();
         open();
@@ -303,13 +303,13 @@ private Q_SLOTS:
         QCOMPARE(m_messages.take(), (Reports{{43, "UserTemplate_003"}}));
         answer(MessageDefine::CLOSE_CANCEL);
         QCOMPARE(users()->count(), 5);
-        answer(MessageDefine::CLOSE_OK); // to nobody's question
+        answer(MessageDefine::CLOSE_OK); // without a question
         QCOMPARE(users()->count(), 5);
 
         tap(button("deleteTemplateButton"));
         tap(button("deleteTemplateButton"));
         QCOMPARE(m_messages.take().size(), 2);
-        answer(MessageDefine::CLOSE_OK, 117); // another box
+        answer(MessageDefine::CLOSE_OK, 117); // the answer to another message
         QCOMPARE(users()->count(), 5);
         answer(MessageDefine::CLOSE_OK);
         QCOMPARE(names(users()), QStringList({"UserTemplate_001", "UserTemplate_002", "UserTemplate_004",
@@ -336,7 +336,7 @@ private Q_SLOTS:
         tapItem(users(), 1);
         answer(MessageDefine::CLOSE_OK);
         QCOMPARE(users()->count(), 3);
-        // Asked about one that went meanwhile.
+        // The template is deleted while the question is shown.
         tap(button("deleteTemplateButton"));
         m_picker->slotDeleteUserTemplate(m_fixture.userRoot() + "/UserTemplate_002/");
         answer(MessageDefine::CLOSE_OK);
@@ -373,7 +373,7 @@ private Q_SLOTS:
         QCOMPARE(users()->archive(3)->getOrder(), std::string("4"));
         QCOMPARE(m_fixture.userOrder().last(), QString("UserTemplate_004"));
         QCOMPARE(users()->item(3)->getIndex(), 3);
-        // The new one is chosen, whichever was before, and remembered.
+        // The new template is selected, whichever was selected before, and remembered.
         QCOMPARE(users()->selectedItem(), users()->item(3));
         QVERIFY(hasSelectedStyle(users()->item(3)));
         QVERIFY(button("selectUserButton")->isEnabled() && button("deleteTemplateButton")->isEnabled());
@@ -398,7 +398,7 @@ private Q_SLOTS:
         QVERIFY(users()->archive(4)->text().empty());
         QVERIFY(QFile::exists(m_fixture.userTitle("新 import")));
         QCOMPARE(users()->item(4)->geometry().topLeft() - users()->item(0)->pos(), QPoint(0, 153));
-        // Over a name in use: the old one goes and the new one is the last.
+        // An import under a name in use replaces the old template; the new one is the last.
         tapItem(users(), 1);
         m_fixture.makeUserPictures("UserTemplate_002");
         m_picker->slotImportNewUserTemplate(m_fixture.userRoot() + "/UserTemplate_002");
@@ -409,7 +409,7 @@ private Q_SLOTS:
         QVERIFY(!users()->selectedItem());
         QVERIFY(!button("deleteTemplateButton")->isEnabled());
         verifyDense();
-        // Nothing to import.
+        // These names cannot be imported.
         for (const char* name : {"gone", "", "..", "/"})
             m_picker->slotImportNewUserTemplate(name);
         QCOMPARE(users()->count(), 5);
@@ -430,7 +430,7 @@ private Q_SLOTS:
         QCOMPARE(m_fixture.userOrder(), names(users()));
         UserTemplatePickerController controller;
         QCOMPARE(controller.getLastSelectedTemplate(), m_fixture.userTitle("片头").toStdString());
-        // One that is not chosen, told with its title file.
+        // A template that is not selected is renamed; the notice has the path of its title file.
         QVERIFY(QDir(m_fixture.userRoot()).rename("UserTemplate_001", "x"));
         m_picker->slotRenameUserTemplate("UserTemplate_001", "x", m_fixture.userTitle("x"));
         QCOMPARE(users()->archive(0)->getPath(), m_fixture.userTitle("x").toStdString());
@@ -459,7 +459,7 @@ private Q_SLOTS:
         m_picker->slotDeleteUserTemplate("");
         QCOMPARE(users()->count(), 4);
         QVERIFY(m_reports.take().isEmpty());
-        // The tap on what took the place of the gone one.
+        // Taps the template that took the place of the deleted one.
         tapItem(users(), 2);
         QCOMPARE(fileName()->text(), QString("UserTemplate_004"));
     }
@@ -493,7 +493,7 @@ private Q_SLOTS:
         m_fixture.makeUserTemplates(count - 1);
         makePicker();
         QScrollBar* bar = users()->scrollArea()->verticalScrollBar();
-        // Hidden, as after the list has saved a template, and then while it is open.
+        // The first round runs while the picker is hidden, as when the list saves a template, the second one while it is open.
         for (int round = 0; round < 2; ++round) {
             const QString name = QStringLiteral("saved %1").arg(round);
             m_fixture.makeUserTemplate(name);
@@ -506,7 +506,7 @@ private Q_SLOTS:
                         last->visibleRegion().boundingRect() == last->rect());
             QCOMPARE(bar->value(), bar->maximum());
         }
-        // Once: later rows do not move what the operator looks at.
+        // The picker scrolls once: later rows do not move the view.
         bar->setValue(0);
         m_fixture.makeUserTemplate("later 1");
         for (int i = 0; i < 4; ++i) {

@@ -20,7 +20,7 @@ QStringList systemLog;
 
 } // namespace
 
-// In the place of the platform library's: what goes to the system log stays here.
+// Replaces the function of the platform library and keeps what would go to the system log.
 extern "C" void k2sys_syslog(int priority, const char* format, ...)
 {
     char line[1024];
@@ -227,7 +227,7 @@ void tst_templatepicker_notices::importOfAFolderThatIsNotThere_data()
 void tst_templatepicker_notices::importOfAFolderThatIsNotThere()
 {
     QFETCH(QString, path);
-    // The files' times tell another order than the tiles.
+    // The times of the files give another order than the tiles.
     m_fixture.makeUserTemplate("UserTemplate_001");
     QVERIFY(QDir(m_fixture.userRoot() + "/UserTemplate_002").removeRecursively());
     users()->item(1)->clickTriggered();
@@ -235,7 +235,7 @@ void tst_templatepicker_notices::importOfAFolderThatIsNotThere()
     QCOMPARE(names(), QStringList({"UserTemplate_001", "UserTemplate_003"}));
     QCOMPARE(m_fixture.userOrder(), names());
     QVERIFY(!users()->selectedItem());
-    // And a reading of what is on disk tells no other.
+    // Reading the disk again gives the same.
     m_picker->reloadTemplates2();
     QCOMPARE(names(), QStringList({"UserTemplate_001", "UserTemplate_003"}));
 }
@@ -284,7 +284,7 @@ void tst_templatepicker_notices::pathsOutsideChangeNothing()
         QCOMPARE(m_log.takeDebugLines("ConfinedPath").size(), 1);
     }
     QVERIFY(systemLog.isEmpty());
-    // A record that leads outside all the same deletes nothing there.
+    // A record whose path leads outside does not delete files there.
     UserTemplatePickerController().deleteTemplate((folder + "/Titler.xml").toStdString());
     QVERIFY(isUnchanged());
 }
@@ -300,7 +300,7 @@ void tst_templatepicker_notices::foldersThatAreLinksElsewhere()
     m_picker->slotImportNewUserTemplate("UserTemplate_003");
     QCOMPARE(names(), before);
     QVERIFY(!QFile::exists(elsewhere + "/Titler.xml"));
-    // The next reading leaves it out.
+    // The next reading does not list it.
     QVERIFY(QFile::copy(m_fixture.userTitle("UserTemplate_001"), elsewhere + "/Titler.xml"));
     UserTemplateManager::getInstance()->reCreateNewOrderXml();
     QCOMPARE(m_fixture.userOrder(), QStringList({"UserTemplate_001", "UserTemplate_002"}));
@@ -326,7 +326,7 @@ void tst_templatepicker_notices::taps()
     QVERIFY(!m_picker->isVisible());
     QCOMPARE(m_picker->result(), int(QDialog::Rejected));
     QCOMPARE(m_log.takeOperations(), QStringList("[Template Area] 200: Tap Cancel Button"));
-    // Closed otherwise, nobody tapped.
+    // Closing the dialog in another way is not logged as a tap.
     m_picker->show();
     m_picker->reject();
     QVERIFY(m_log.takeOperations().isEmpty());

@@ -87,7 +87,7 @@ private Q_SLOTS:
         touch().move(0, start);
         touch().release(0, start);
         QCOMPARE(m_pressed->size(), isTap ? 1 : 0);
-        // The same with no update between.
+        // The same without an update between begin and end.
         m_area->stopFlick();
         touch().press(0, start);
         touch().release(0, start + way);
@@ -102,7 +102,7 @@ private Q_SLOTS:
         QTRY_VERIFY(value() >= 190);
         QTRY_VERIFY(m_area->isFlickEnd());
         QVERIFY(value() <= 200);
-        // Back to where it came from, held still, and lifted: no flick.
+        // A finger that returns, rests and lifts does not start a flick.
         touch().move(0, QPoint(150, 298));
         QTRY_VERIFY(value() <= 10);
         QTRY_VERIFY(m_area->isFlickEnd());
@@ -120,7 +120,7 @@ private Q_SLOTS:
         QTRY_COMPARE(value(), m_area->verticalScrollBar()->maximum());
         QTest::qWait(3 * TemplateScrollArea::TOUCH_TIMER_TIME);
         QCOMPARE(value(), m_area->verticalScrollBar()->maximum());
-        // The grid is not in flight any more: the next finger taps.
+        // The grid does not move any more, so the next touch is a tap.
         tap(QPoint(150, 100));
         QCOMPARE(m_pressed->size(), 1);
     }
@@ -193,7 +193,7 @@ private Q_SLOTS:
         QCOMPARE(m_pressed->size(), 1);
     }
 
-    // As when a dialog took it.
+    // The end of the first touch is missing, as when a dialog opens.
     void aTouchAfterOneWithoutAnEnd()
     {
         touch().press(0, QPoint(150, 100));
@@ -211,7 +211,7 @@ private Q_SLOTS:
         QCOMPARE(m_pressed->size(), 1);
     }
 
-    // Its end never comes then.
+    // A touch whose button is destroyed never gets its end.
     void theTouchedButtonGoes()
     {
         touch().press(0, QPoint(150, 100));

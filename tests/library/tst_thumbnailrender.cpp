@@ -166,7 +166,7 @@ void tst_thumbnailrender::fastStageLogsWhereTheTextsAre()
     QVERIFY(log.takeDebugLines().isEmpty());
 }
 
-// Black and, other than that of the canvas and the large pictures, opaque.
+// The shadow is black and opaque, unlike that of the canvas and of the large pictures.
 void tst_thumbnailrender::shadowOfTheFastStage()
 {
     const auto archive = LibraryFixture::makeRecord(m_fixture.makeFolder(QStringLiteral("shadow")),
@@ -181,7 +181,7 @@ void tst_thumbnailrender::shadowOfTheFastStage()
     text->getTextShadow()->setShadowDirectionY(1);
     archive->setText({text});
 
-    // The highest alpha of what is black: in the narrow gaps, which have shadow from all sides.
+    // Returns the highest alpha of a black pixel. It is found in narrow gaps, which have shadow from all sides.
     const auto opacity = [](const QImage& image) {
         int highest = 0;
         for (int y = 0; y < image.height(); ++y) {
@@ -198,7 +198,7 @@ void tst_thumbnailrender::shadowOfTheFastStage()
     const int fast = opacity(fastPicture(render, *archive));
     const int large = opacity(slowPicture(*archive, "_1920.png"));
     QVERIFY2(large > 100 && large <= 190, qPrintable(QString::number(large)));
-    // Softer in the small picture, where a shadow of the same colour would be the lighter one.
+    // The small picture has the darker shadow.
     QVERIFY2(fast > large + 20, qPrintable(QStringLiteral("%1 and %2").arg(fast).arg(large)));
 }
 
@@ -233,7 +233,7 @@ void tst_thumbnailrender::hugeBackgroundGivesPicturesOfTheUsualSize()
     const QImage big = slowPicture(*archive, "_1920.png");
     QCOMPARE(big.size(), QSize(1920, 1080));
     QCOMPARE(big.pixelColor(1917, 1077), QColor(Qt::blue));
-    // One that is too large is as good as none.
+    // A background that is too large is treated like a missing one.
     paint(folder + QStringLiteral("/bg.png"), QSize(8193, 10), Qt::blue);
     QCOMPARE(fastPicture(render, *archive).pixelColor(237, 132).alpha(), 0);
 }
@@ -314,7 +314,7 @@ void tst_thumbnailrender::slowStageReplacesNothingElse()
     QVERIFY(QFile::exists(folder + QStringLiteral("/t_960.png")));
 }
 
-// Nobody asks whether it has finished.
+// The test does not call makePictureThreadIsFinished().
 void tst_thumbnailrender::slowStageDrawsWhileTheEventsGoOn()
 {
     const QString folder = m_fixture.makeFolder(QStringLiteral("events"));
@@ -325,7 +325,7 @@ void tst_thumbnailrender::slowStageDrawsWhileTheEventsGoOn()
     for (const QString name : {"a", "b", "c"}) {
         const auto archive = LibraryFixture::makeRecord(folder, name, QStringLiteral("In order"));
         archive->setBgResourceBig(name == QLatin1String("c") ? "" : "bg.png");
-        render.makeThumbnail(archive.get(), true); // the record goes before the picture is drawn
+        render.makeThumbnail(archive.get(), true); // the record is destroyed before the picture is drawn
         wanted.append({1, name});
     }
     Reports seen;

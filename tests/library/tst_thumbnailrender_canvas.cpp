@@ -127,7 +127,7 @@ void tst_thumbnailrender_canvas::compare(const Pictures& pictures, double tolera
         worstCell(onGrey(pictures.canvas, QSize(240, 135)), onGrey(pictures.list, QSize(240, 135)), 3);
     QVERIFY2(onAir <= tolerance, qPrintable(QString("on air %1").arg(onAir)));
     QVERIFY2(inList <= tolerance, qPrintable(QString("in the list %1").arg(inList)));
-    // Nothing stands elsewhere: edges of the ink, in canvas pixels.
+    // Compares the edges of the ink, in canvas pixels.
     const QRect a = ink(pictures.canvas);
     const QRect b = ink(pictures.air);
     const QRectF scaled(b.x() / 1.5, b.y() / 1.5, b.width() / 1.5, b.height() / 1.5);
@@ -156,10 +156,10 @@ void tst_thumbnailrender_canvas::everyProperty_data()
                            "edge width", "edge colour", "shadow", "align",  "kerning", "position"};
     for (int id = 0; id < 12; ++id) {
         for (const int value : {0, 1}) {
-            // Off is what the other rows show.
+            // The other rows show the property switched off.
             if (value == 1 && (id == 2 || id == 3 || id == 5))
                 continue;
-            // Shadows are lighter on the canvas, and as wide in pixels there as on the larger raster.
+            // Shadows are lighter on the canvas; in pixels they are as wide as on the larger raster.
             const bool shadow = id == TextObjectConstants::PropertyShadow;
             QTest::addRow("%s %d", names[id], value)
                 << id << value << (shadow ? 40.0 : 24.0) << (shadow ? 24 : 3);
@@ -181,7 +181,7 @@ void tst_thumbnailrender_canvas::everyProperty()
     const Pictures& before = m_plain;
     const Pictures after = picturesOf({styled});
     compare(after, tolerance, edge);
-    // The property shows in each of the three.
+    // The property is visible in all three pictures.
     QVERIFY(worstCell(onGrey(before.canvas, QSize(1280, 720)), onGrey(after.canvas, QSize(1280, 720)), 16) >
             10.0);
     QVERIFY(worstCell(onGrey(before.list, QSize(240, 135)), onGrey(after.list, QSize(240, 135)), 3) > 10.0);

@@ -14,7 +14,7 @@
 namespace
 {
 
-// What goes to the system log while it lives, on its way through the standard error channel.
+// Collects what goes to the system log during its lifetime, from the standard error channel.
 class SystemLogCatcher
 {
 public:
@@ -175,7 +175,7 @@ void tst_titlefileoperations::thumbnailWithoutExtensionSkipsTheBackground()
     QCOMPARE(made->getThumbnailSmall(), made->getName() + "_240.png");
     QCOMPARE(made->getBgResource(), std::string("old.png"));
 
-    // In another folder this name may be taken.
+    // The name may be in use in another folder.
     const QString other = m_fixture.makeFolder(QStringLiteral("no extension elsewhere"));
     writeFile(folder + QStringLiteral("/old.png"), "background");
     writeFile(other + QStringLiteral("/old.png"), "of another title");
@@ -262,7 +262,7 @@ void tst_titlefileoperations::templateThatIsThereStays()
     QVERIFY(!before.isEmpty());
     QVERIFY(!m_files.createUserTemplate(folder, QStringLiteral("UserTemplate_001"), *second));
     QCOMPARE(readFile(path), before);
-    // Its folder alone does not keep the name.
+    // A folder without its title does not keep the name in use.
     QVERIFY(QFile::remove(path));
     QVERIFY(m_files.createUserTemplate(folder, QStringLiteral("UserTemplate_001"), *second));
 }
