@@ -223,7 +223,8 @@ void tst_presettemplates::backgroundsHaveAlphaAtBothSizes()
 
 void tst_presettemplates::textStandsWhereItIsPut()
 {
-    constexpr int TOLERANCE = 6; // for the bearings of the letters, and since places are whole pixels of the canvas
+    // for the bearings of the letters, and since places are whole pixels of the canvas
+    constexpr int TOLERANCE = 6;
     for (const auto align : {SampleText::LEFT, SampleText::CENTRE, SampleText::RIGHT}) {
         for (const int size : {44, 138}) {
             SampleText::Look look;

@@ -82,7 +82,8 @@ void tst_textplacement::range()
 void tst_textplacement::limits_data()
 {
     QTest::addColumn<QPointF>("wanted");
-    // taken: what is subtracted from the place; reach: what is added to the point from which the finger drags.
+    // taken: what is subtracted from the place; reach: what is added to the point from which the finger
+    // drags.
     QTest::addColumn<QPointF>("corner");
     QTest::addColumn<QPointF>("taken");
     QTest::addColumn<QPointF>("reach");

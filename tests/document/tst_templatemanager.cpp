@@ -211,7 +211,8 @@ private Q_SLOTS:
         QCOMPARE(english[1]->getPath(), userFile("middle/Titler.xml").toStdString());
     }
 
-    // A file named after its folder passes the first check of an entry; only the title file passes the second.
+    // A file named after its folder passes the first check of an entry; only the title file passes the
+    // second.
     void titleFileNamedAfterItsFolder()
     {
         makeUserTemplate("a", 100);

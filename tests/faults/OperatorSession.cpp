@@ -84,7 +84,7 @@ OperatorSession::OperatorSession(const QString& titleRoot) : m_root(titleRoot)
     m_scene = m_window->findChild<CanvasScene*>();
     m_folders = m_window->findChild<FolderPicker*>();
     m_templates = m_window->findChild<TemplatePicker*>();
-    // Nobody looks: what they would paint costs more than all the rest.
+    // Painting is switched off, since it would cost more than everything else and is not looked at.
     for (QWidget* widget : {static_cast<QWidget*>(m_window.get()), static_cast<QWidget*>(m_folders),
                             static_cast<QWidget*>(m_templates)})
         widget->setUpdatesEnabled(false);
@@ -98,8 +98,8 @@ OperatorSession::~OperatorSession()
     APPEventFilter::release();
 }
 
-// A dialog runs a loop of its own; what is to be done in it is done from there, once, and then it is left.
-// One that is opened by that has its turn, too: each look comes from a timer of its own.
+// A dialog runs an event loop of its own. A timer carries out the action in it, once, and then closes it.
+// Each dialog has a timer of its own, since an action may open another one.
 void OperatorSession::watchDialogs()
 {
     QTimer::singleShot(DIALOG_WATCH, this, &OperatorSession::watchDialogs);
@@ -163,7 +163,7 @@ void OperatorSession::noteList()
     m_known[m_open].order = order;
 }
 
-// Until the pictures are written and on the disk, as far as it takes them.
+// Waits until the pictures are written and synced, as far as the disk accepts them.
 void OperatorSession::settle()
 {
     const QDeadlineTimer limit(m_isSlow ? SETTLE_TIMEOUT_LATER : SETTLE_TIMEOUT);
@@ -361,7 +361,7 @@ void OperatorSession::end()
     m_window->endProcess();
 }
 
-// Whatever is asked, the operator wants to close.
+// Answers every question so that the window closes.
 void OperatorSession::close(bool healFirst)
 {
     if (healFirst)

@@ -1,5 +1,5 @@
-// The pages of the gallery against what they looked like when somebody looked at them, and the monkey's word
-// that a seed plays the same game again.
+// Compares the pages of the gallery with approved pictures, and checks that a seed of the monkey repeats its
+// touches.
 #include "app/APPEventFilter.h"
 #include "gallery/GalleryPages.h"
 #include "gallery/GalleryScreen.h"
@@ -16,7 +16,8 @@
 namespace
 {
 
-// Of a colour part in the average of a cell, 0 to 255. Glyphs may differ by a few levels from run to run.
+// The tolerance of a colour component in the mean of a cell, 0 to 255. Glyphs may differ by a few levels
+// between runs.
 constexpr int TOLERANCE = 5;
 
 QStringList kept(const QString& page)
@@ -96,7 +97,7 @@ void tst_gallerypages::aChangeIsSeen()
     picture.fill(QColor(50, 50, 50));
     const QStringList before = PagePicture::digest(picture);
     QCOMPARE(PagePicture::compare(before, before, TOLERANCE).cells, 0);
-    // As thin as the stroke of a letter.
+    // A line as thin as the stroke of a letter.
     for (int y = 100; y < 110; ++y) {
         picture.setPixelColor(200, y, QColor(220, 220, 220));
         picture.setPixelColor(201, y, QColor(220, 220, 220));

@@ -1,4 +1,4 @@
-// Every touch widget of the gallery, interrupted in every way while a finger works it.
+// Interrupts the touch on every touch widget of the gallery in every way.
 #include "Interruptions.h"
 #include "gallery/GalleryPages.h"
 #include "gallery/GalleryScreen.h"
@@ -30,7 +30,7 @@ private:
     static inline QStringList s_names;
 };
 
-// The page as new, with what it opens, and no finger on it.
+// Restores the page and its popups, with no finger on them.
 void tst_gallerypages_interruptions::open(int page)
 {
     m_page.close();
@@ -44,7 +44,7 @@ void tst_gallerypages_interruptions::open(int page)
     m_clock.advance(5000);
 }
 
-// A row alone, anything else with all that it is a part of.
+// A row is tested alone, any other widget with its ancestors.
 void tst_gallerypages_interruptions::destroy(QWidget* widget)
 {
     if (widget->window() != m_page.window.get() || widget->isWindow()) {
@@ -80,7 +80,7 @@ void tst_gallerypages_interruptions::everyWidget()
     QVERIFY2(result.isEmpty(), qPrintable(QLatin1Char('\n') + result.join(QLatin1Char('\n'))));
 }
 
-// The walk finds what there is to be found.
+// Checks that the walk finds the widgets.
 void tst_gallerypages_interruptions::everyClassIsThere()
 {
     const QString names = s_names.join(QLatin1Char('\n'));

@@ -640,7 +640,8 @@ void tst_archivelist::followsARenamedFolder()
     QCOMPARE(m_canvas, (QStringList{QStringLiteral("a")}));
     QCOMPARE(ArchiveController().getLastFolderPath(), after);
     QCOMPARE(m_label->text(), QStringLiteral("after"));
-    QCOMPARE(m_folders.take(), (QStringList{QStringLiteral("start after")})); // the old path does not exist any more
+    // the old path does not exist any more
+    QCOMPARE(m_folders.take(), (QStringList{QStringLiteral("start after")}));
 }
 
 void tst_archivelist::renamedEmptyFolderOffersATemplate()

@@ -276,10 +276,12 @@ void tst_archivelist_folders::skippedTitlesKeepTheirPlaceInTheOrder()
     write(folder + "/picture.png", foreign);
     cutInHalf(folder + "/b.xml");
     m->open(folder);
-    QCOMPARE(LibraryFixture::order(folder), (Names{"a", "b", "c"})); // opening a folder does not write its order
+    // opening a folder does not write its order
+    QCOMPARE(LibraryFixture::order(folder), (Names{"a", "b", "c"}));
     m->list->moveButtonClicked(true);
     m->carry(0, 65 + TitleListFixture::ROW);
-    QCOMPARE(LibraryFixture::order(folder), (Names{"c", "a", "b"})); // a title that was not shown keeps its place
+    // a title that was not shown keeps its place
+    QCOMPARE(LibraryFixture::order(folder), (Names{"c", "a", "b"}));
     m->list->synchronizationFolderFile();
     for (const char* name : {"/a.xml", "/a_240.png", "/c.xml", "/c_240.png"})
         QVERIFY(QFile::exists(folder + name));
@@ -300,7 +302,8 @@ void tst_archivelist_folders::unreadableFolder()
         QCOMPARE(picker.size(), 1);
         m_messages.take();
         m->hold(TitleListFixture::PICTURE_X, 400);
-        m->choose(ArchiveAction::ACTION_CREATE); // no picker is shown, since a new title could not be shown either
+        // no picker is shown, since a new title could not be shown either
+        m->choose(ArchiveAction::ACTION_CREATE);
         QCOMPARE(m_messages.take(), (Reports{{114, QStringLiteral("File")}}));
         QCOMPARE(picker.size(), 1);
         Archive blank;

@@ -493,7 +493,8 @@ private Q_SLOTS:
         m_fixture.makeUserTemplates(count - 1);
         makePicker();
         QScrollBar* bar = users()->scrollArea()->verticalScrollBar();
-        // The first round runs while the picker is hidden, as when the list saves a template, the second one while it is open.
+        // The first round runs while the picker is hidden, as when the list saves a template, the second one
+        // while it is open.
         for (int round = 0; round < 2; ++round) {
             const QString name = QStringLiteral("saved %1").arg(round);
             m_fixture.makeUserTemplate(name);

@@ -181,7 +181,8 @@ void tst_thumbnailrender::shadowOfTheFastStage()
     text->getTextShadow()->setShadowDirectionY(1);
     archive->setText({text});
 
-    // Returns the highest alpha of a black pixel. It is found in narrow gaps, which have shadow from all sides.
+    // Returns the highest alpha of a black pixel. It is found in narrow gaps, which have shadow from all
+    // sides.
     const auto opacity = [](const QImage& image) {
         int highest = 0;
         for (int y = 0; y < image.height(); ++y) {

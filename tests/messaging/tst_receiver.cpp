@@ -137,7 +137,7 @@ void tst_receiver::receiverKeepsTheFirstOfAnId()
     PTC::Event call(5, 1, nullptr, 0, true, false);
     receiver.handleEvent(&call);
     QCOMPARE(first->calls.size(), 1);
-    QCOMPARE(second->calls.size(), 0); // lost, yet the one who made it may go on using it
+    QCOMPARE(second->calls.size(), 0); // not delivered, but its owner may still use it
     QCOMPARE(second->getId(), 5L);
 }
 
@@ -195,7 +195,7 @@ void tst_receiver::qtReceiverHandlesInItsThread()
     QTRY_COMPARE(adapter->calls.size(), 1);
     QCOMPARE(adapter->calls.front().thread, QThread::currentThread());
     QCOMPARE(adapter->calls.front().payload, QByteArray("abc"));
-    // The receiver's own thread is never held up.
+    // The receiver's own thread is never blocked.
     for (int i = 0; i < PTC::QtReceiver::MAX_PENDING_EVENTS * 2; ++i)
         receiver.recv(new PTC::Event(3, 8, newData("d"), 1, true, false));
     QTRY_COMPARE(adapter->calls.size(), 1 + PTC::QtReceiver::MAX_PENDING_EVENTS * 2);
@@ -230,7 +230,7 @@ void tst_receiver::undeliveredEventsAreFreed()
     auto receiver = std::make_unique<PTC::QtReceiver>(1);
     receiver->recv(new PTC::Event(3, 8, newData("abc"), 3, true, false));
     QCOMPARE(receiver->pendingEvents(), 1);
-    receiver.reset(); // a leak checker sees what is left
+    receiver.reset(); // the leak checker reports what is not freed
     QCoreApplication::processEvents();
 }
 

@@ -39,7 +39,7 @@ QString say(const std::wstring& text)
     return QString::fromStdWString(text);
 }
 
-// The client of all services, which writes down what it is told.
+// The client of all services, which records the calls.
 class Client : public IAPPEventFilterCallBack,
                public IAPPEventFilterNotify,
                public IFileManagerControllerCallBack,
@@ -156,7 +156,7 @@ private:
 
 } // namespace
 
-// Both ends in one: the appliance's adapters in one receiver, the client's in another.
+// Both ends in one process: the appliance's adapters in one receiver, the client's in another.
 class tst_servicetable : public QObject, private PTC::IAdapterFactory, private PTC::IProxyFactory
 {
     Q_OBJECT
@@ -535,7 +535,7 @@ void tst_servicetable::unknownMethodsLeaveTheTargetAlone()
             if (adapter == nullptr)
                 continue;
             char payload[4] = {};
-            adapter->setTarget(reinterpret_cast<void*>(1)); // a call of it would crash
+            adapter->setTarget(reinterpret_cast<void*>(1)); // a call through it would crash
             for (const long method : {0L, -1L, 99L, 1L << 40}) {
                 PTC::Event event(1, method, payload, sizeof payload, true, true);
                 adapter->receive(&event);
@@ -653,7 +653,7 @@ void tst_servicetable::titlerRegistrationWithinTheProcess()
     QVERIFY(event.getData() == nullptr); // freed by the adapter
     PTC::Event shortEvent(117, TitlerAdapter::METHOD_registerCallBack, new char[1]{}, 1, false, false);
     adapter.receive(&shortEvent);
-    QVERIFY(titler.calls.isEmpty()); // nobody is client number 0, and who registered before stays
+    QVERIFY(titler.calls.isEmpty()); // there is no client number 0; the earlier registration stays
 }
 
 void tst_servicetable::titlerUnknownMethods()
@@ -721,7 +721,7 @@ void tst_servicetable::senderKeys()
         QVERIFY(!ServiceTable::isSibling(other));
     }
     for (long client = 1000; client <= 1008; ++client)
-        QCOMPARE(ServiceTable::isSibling(client), client != 1003); // which is this process
+        QCOMPARE(ServiceTable::isSibling(client), client != 1003); // the client number of this process
 }
 
 QTEST_GUILESS_MAIN(tst_servicetable)

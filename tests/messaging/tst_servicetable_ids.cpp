@@ -1,5 +1,5 @@
-// The ids of the methods on the wire, which other programs are built with: a mistake in one would be made by
-// the library and by everything that is tested with it alike.
+// Lists the ids of the methods on the wire again, since other programs are built with them: both ends of the
+// other tests would make the same mistake.
 #include "messaging/services/ServiceFamilies.h"
 #include "messaging/services/TitlerAdapter.h"
 

@@ -1,5 +1,4 @@
-// The tables of the protocol's page against the tables that the program is made of. Peers are written from
-// the page.
+// Compares the tables of the protocol's page, from which peers are written, with the tables in the program.
 #include "messaging/services/ServiceFamilies.h"
 #include "messaging/services/ServiceTable.h"
 
@@ -50,7 +49,7 @@ QString kindOfValue(const std::wstring&)
     return "wide";
 }
 
-// Everything that the page says, by the program's tables.
+// Returns what the page must say, from the program's tables.
 class ServiceRows
 {
 public:

@@ -86,7 +86,7 @@ private:
 void tst_socketremotereceiver::initTestCase()
 {
     TestPorts::useFreeOffset();
-    std::signal(SIGPIPE, SIG_DFL); // a write that raises it ends this program
+    std::signal(SIGPIPE, SIG_DFL); // a write that raises SIGPIPE would end this program
 }
 
 void tst_socketremotereceiver::init()
@@ -262,7 +262,7 @@ void tst_socketremotereceiver::fiveThousandReconnections()
         if (i % 500 == 0)
             QTRY_VERIFY(openDescriptors() <= before + SocketRemoteReceiver::MAX_ENDED_CONNECTIONS + 3);
     }
-    // The sockets of those that ended last are kept.
+    // The sockets of the connections that ended last are kept.
     QTRY_COMPARE(openDescriptors(), before + SocketRemoteReceiver::MAX_ENDED_CONNECTIONS);
     m_server.reset();
     QVERIFY(openDescriptors() < before);
@@ -280,13 +280,13 @@ void tst_socketremotereceiver::openConnectionsAreLimited()
         QVERIFY(peers.back()->write("x"));
         QCOMPARE(peers.back()->read(3).size(), qsizetype(3));
     }
-    // One more waits until another ends, and then is served.
+    // A further connection waits until another one ends, and is served then.
     TestSocket waiting(SERVER);
     QVERIFY(waiting.write("x"));
     QVERIFY(waiting.nothingToRead());
     peers.erase(peers.begin() + 7);
     QCOMPARE(waiting.read(3), QByteArray("OK\0", 3));
-    // The others have not been touched.
+    // The other connections are not affected.
     for (const auto& peer : peers) {
         QVERIFY(peer->write("y"));
         QCOMPARE(peer->read(3).size(), qsizetype(3));
@@ -365,7 +365,7 @@ void tst_socketremotereceiver::senderFrame()
     TestSocket peer = listener.accept();
     const QByteArray first = peer.read(20480);
     QByteArray expected = frame(4, 117, 5, QByteArray(payload, sizeof payload));
-    expected.replace(24, 8, first.mid(24, 8)); // an address, free of meaning
+    expected.replace(24, 8, first.mid(24, 8)); // any value
     QCOMPARE(first, expected);
     const QByteArray second = peer.read(20480);
     expected = TestSocket::frame(4, 3, 6, true, 1, false, "p");

@@ -84,7 +84,7 @@ void tst_socketremotesender_outage::initTestCase()
     TestPorts::useFreeOffset();
     qputenv("K2SYS_LOG_DIR", m_logs.path().toUtf8());
     INIT_LOGGING(L"test");
-    std::signal(SIGPIPE, SIG_DFL); // a write that raises it ends this program
+    std::signal(SIGPIPE, SIG_DFL); // a write that raises SIGPIPE would end this program
 }
 
 void tst_socketremotesender_outage::cleanupTestCase()
@@ -98,7 +98,7 @@ void tst_socketremotesender_outage::init()
     m_linesBefore = logLines();
 }
 
-// Since the test began.
+// Returns the time since the test began.
 int tst_socketremotesender_outage::logLines() const
 {
     QFile log(m_logs.filePath("k2_ope_debug.log"));
@@ -128,7 +128,7 @@ void tst_socketremotesender_outage::aPeerThatReadsAgainGetsTheNewestCalls()
     TestSocket peer = listener.accept();
     for (int i = 0; i < FLOOD; ++i)
         call(sender, i);
-    // Whole frames in their order, without those that were dropped, and all of the newest.
+    // Only whole frames arrive, in their order, without the dropped ones; all of the newest arrive.
     qint64 last = -1;
     int received = 0;
     int newest = 0;
@@ -146,7 +146,7 @@ void tst_socketremotesender_outage::aPeerThatReadsAgainGetsTheNewestCalls()
         QCOMPARE(methodOf(peer.read(SocketFrame::FRAME_SIZE)), qint64(FLOOD + i));
     }
     QCOMPARE(logLines(), 1);
-    // A second outage is a line of its own.
+    // A second outage is logged with a line of its own.
     for (int i = 0; i < FLOOD; ++i)
         call(sender, i);
     QCOMPARE(logLines(), 2);
@@ -240,7 +240,7 @@ void tst_socketremotesender_outage::connectingIsGivenUp()
     timer.start();
     QVERIFY(!sender.initialize(PEER));
     QVERIFY(timer.elapsed() < 10 * SocketRemoteSender::CONNECT_TIMEOUT_MS);
-    // Without waiting for it the answer is that somebody listens.
+    // The result is that a process listens, without waiting for the connection.
     timer.start();
     QVERIFY(sender.beginConnect(PEER));
     for (int i = 0; i < 10; ++i) {
@@ -249,7 +249,7 @@ void tst_socketremotesender_outage::connectingIsGivenUp()
         QVERIFY(!sender.reconnect());
     }
     QVERIFY2(timer.elapsed() < MOST_GUI_MS, qPrintable(QString::number(timer.elapsed())));
-    // Their connection never comes: the calls are lost after the deadline.
+    // The connection is never made: the calls are dropped after the deadline.
     QTRY_COMPARE_WITH_TIMEOUT(logLines(), 1, 10 * SocketRemoteSender::CONNECT_TIMEOUT_MS);
 }
 

@@ -1,4 +1,4 @@
-// The wire form of the records: there and back, and from messages that are cut or mean nothing.
+// The wire form of the records: round trips, and messages that are truncated or malformed.
 #include "messaging/services/RecordPacking.h"
 #include "messaging/services/TitlerParams.h"
 #include "tests/support/RandomSeed.h"
@@ -264,7 +264,7 @@ void tst_wirerecord::hugeLengths()
 
 void tst_wirerecord::wrongTypesReadAsTheyStand()
 {
-    // A raw where a number is wanted gives its length, a number where a text is wanted gives none.
+    // Reading a number from a raw gives its length, reading a text from a number gives an empty text.
     const Message message(QByteArray::fromHex("a3616263"
                                               "05"));
     _SHOW_TITLER_PARAMTER param;

@@ -76,7 +76,7 @@ void tst_colorpalette::table()
         QCOMPARE(button(i)->grab().toImage().pixelColor(20, 20), QColor(colors.at(i)));
 }
 
-// The picture of the frame is round; beside it nothing of the system's colours shows.
+// The corners of the frame are round; outside of them no system colour is visible.
 void tst_colorpalette::cornersAreDark()
 {
     const QImage picture = m_palette->grab().toImage();
@@ -253,7 +253,7 @@ void tst_colorpalette::masksTakeTheTouches()
     QCOMPARE(top->geometry(), m_palette->rect());
     m_palette->showMessageMask(true);
     m_palette->showMessageMask(false);
-    QVERIFY(!m_palette->testAttribute(Qt::WA_AcceptTouchEvents)); // the dialog's mask still shows
+    QVERIFY(!m_palette->testAttribute(Qt::WA_AcceptTouchEvents)); // the mask of the dialog is still shown
     m_palette->showDialogMask(false);
     QVERIFY(m_palette->testAttribute(Qt::WA_AcceptTouchEvents));
     QCOMPARE(m_palette->childAt(button(0)->geometry().center()), button(0));

@@ -54,7 +54,7 @@ private:
 void tst_fontcombox::initTestCase()
 {
     m_environment = std::make_unique<PanelEnvironment>();
-    // The same word of where things lie that the provisioning program writes.
+    // The environment variables that say where the data is, as for the provisioning program.
     m_fonts = QString::fromStdWString(IPathManagerEx::getInstance()->getFontsPath());
 }
 
@@ -130,7 +130,7 @@ void tst_fontcombox::setFamilyIsSilent()
 void tst_fontcombox::unknownFamilyShowsNone()
 {
     m_box->setFontFamily(QStringLiteral("KST"));
-    for (const char* family : {"Nobody's Font", "", "kst"}) { // case counts
+    for (const char* family : {"Nobody's Font", "", "kst"}) { // names are case sensitive
         m_box->setFontFamily(QString::fromLatin1(family));
         QCOMPARE(combo()->currentIndex(), -1);
         QCOMPARE(m_box->getFontFamily(), QString());
@@ -177,7 +177,7 @@ void tst_fontcombox::importedFileJoinsTheList()
     QVERIFY(!rows().contains(QStringLiteral(TITLER_IMPORTED_FAMILY)));
     m_box->importFontFamilyNotify(QStringLiteral("imported.ttf"));
     QVERIFY(rows().contains(QStringLiteral(TITLER_IMPORTED_FAMILY)));
-    m_box->importFontFamilyNotify(QStringLiteral("imported.ttf")); // again: once in the list
+    m_box->importFontFamilyNotify(QStringLiteral("imported.ttf")); // imported again: listed once
     QCOMPARE(rows().count(QStringLiteral(TITLER_IMPORTED_FAMILY)), 1);
     m_box->modifyComboxItem(false);
     QCOMPARE(rows(), (QStringList{QStringLiteral("DFHeiW5-A"), QStringLiteral(TITLER_IMPORTED_FAMILY)}));
@@ -203,7 +203,7 @@ void tst_fontcombox::brokenFilesArePassedOver()
     for (const char* file : {"broken.ttf", "empty.otf", "folder.ttf", "pipe.ttf", "missing.ttf", ""})
         m_box->importFontFamilyNotify(QString::fromLatin1(file));
     QCOMPARE(rows(), before);
-    // Neither does a folder that holds them stop a start.
+    // A folder with such files does not prevent the start, either.
     FamilyToolBox later(nullptr);
     QVERIFY(later.comboBox()->findText(QStringLiteral("KST")) >= 0);
     QVERIFY(QFile::remove(pipe) && broken.remove() && empty.remove());
@@ -256,7 +256,7 @@ void tst_fontcombox::paintsTheDisplayName()
                     end = x;
         return end;
     };
-    // "KST Medium" is longer than "KST" and shorter than what the other is known by.
+    // The length of "KST Medium" is between that of "KST" and that of the display name of the other family.
     QVERIFY(inkEnd(shortName) > 80);
     QVERIFY(inkEnd(longName) > inkEnd(shortName));
 }

@@ -64,9 +64,9 @@ private:
         return m_box->findChild<KSPushbutton*>(QStringLiteral("Icon_SizeDown"));
     }
     QString text() const { return edit()->text(); }
-    // A tap on the field, through the box as the finger does it.
+    // Taps the field through the box, as a finger does.
     void tapField() { m_environment->touch(combo(), edit()->geometry().center()); }
-    // What the keyboard does at Enter: the whole text, then the key.
+    // Sends what the keyboard sends at Enter: the whole text, then the key.
     void enter(const QString& typed)
     {
         edit()->selectAll();
@@ -212,12 +212,12 @@ void tst_sizetoolbox::listIsScrolledByAFinger()
     QTest::touchEvent(viewport, m_environment->device).move(0, low - QPoint(0, 150), viewport);
     QTRY_VERIFY(bar->value() > 40);
     QTest::touchEvent(viewport, m_environment->device).release(0, low - QPoint(0, 150), viewport);
-    QVERIFY(changed.isEmpty()); // a drag chooses nothing
+    QVERIFY(changed.isEmpty()); // a drag does not choose a row
     QVERIFY(combo()->view()->isVisible());
     combo()->hidePopup();
 }
 
-// The box is narrow; its list is not.
+// The list is wider than the box.
 void tst_sizetoolbox::listRowsAreWideEnough()
 {
     combo()->showPopup();
@@ -376,7 +376,7 @@ void tst_sizetoolbox::halfTypedSizeIsDroppedByAnotherBox()
     QCOMPARE(text(), QStringLiteral("40+"));
     QVERIFY(m_environment->messages.posted.isEmpty());
     QVERIFY(changed.isEmpty());
-    // The box's own buttons step from what was there.
+    // The buttons of the box step from the former value.
     tapField();
     edit()->selectAll();
     edit()->insert(QStringLiteral("300"));
@@ -400,7 +400,7 @@ void tst_sizetoolbox::halfTypedSizeWhenTheFieldIsLeft()
     QVERIFY(!m_box->isEditing() && edit()->isReadOnly());
     QVERIFY(other.hasFocus());
     m_environment->messages.posted.clear();
-    // A whole size that was not entered is dropped without a word.
+    // A complete size that was not confirmed is dropped without a message.
     m_box->setFontSize({64});
     tapField();
     edit()->selectAll();
@@ -422,7 +422,7 @@ void tst_sizetoolbox::keyboardClosedWhileTyping()
     QVERIFY(m_environment->messages.posted.isEmpty());
 }
 
-// What is typed on the keyboard reaches the field with Enter only; until then there is the verdict about it.
+// Typed text reaches the field with Enter only; until then the keyboard is told whether the text is valid.
 void tst_sizetoolbox::keyboardClosedAfterARefusedSize()
 {
     m_box->setFontSize({64});

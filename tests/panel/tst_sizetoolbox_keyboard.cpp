@@ -80,7 +80,7 @@ void tst_sizetoolbox_keyboard::cleanup()
     m_context->setKeyBoardController(nullptr);
 }
 
-// What the service sends at the end: the whole text, then the key.
+// Sends what the service sends at the end: the whole text, then the key.
 void tst_sizetoolbox_keyboard::type(const wchar_t* text, int key)
 {
     m_context->sendInputStringOnEnterPressing(text);
@@ -149,7 +149,7 @@ void tst_sizetoolbox_keyboard::isPutAwayOnce()
     QCOMPARE(m_service.calls.count(QStringLiteral("close")), 1);
     QCOMPARE(m_service.calls.count(QStringLiteral("show")), 1);
     QVERIFY(!m_box->isEditing() && edit()->isReadOnly() && !edit()->hasFocus());
-    // The service says that it has closed. What comes from it late changes nothing.
+    // The service reports that it has closed. Its later calls change nothing.
     m_context->sendSoftKeyboardState(false);
     const QString text = edit()->text();
     m_context->sendInputStringOnEnterPressing(L"300");
@@ -162,7 +162,7 @@ void tst_sizetoolbox_keyboard::isPutAwayOnce()
     QCOMPARE(m_service.calls.count(QStringLiteral("show")), 2);
 }
 
-// Its own key has closed it already.
+// The keyboard was closed by its own key before.
 void tst_sizetoolbox_keyboard::isNotPutAwayTwice()
 {
     tapField();
@@ -173,7 +173,7 @@ void tst_sizetoolbox_keyboard::isNotPutAwayTwice()
     QVERIFY(!m_service.calls.contains(QStringLiteral("close")));
 }
 
-// Another field has taken the keyboard over while the size was still being typed.
+// Another field has taken over the keyboard while the size was being typed.
 void tst_sizetoolbox_keyboard::isLeftToTheTextThatHasIt()
 {
     tapField();

@@ -149,7 +149,7 @@ void tst_texttoolspanel::sizesGoToTheirCharacters()
     QCOMPARE(items[2]->getFontSize(), 66);
     QCOMPARE(m_environment->newLogLines(),
              QStringList{QStringLiteral("[Text Property Area] 200: Adjust Font Size to 66")});
-    // A list that is too short or too long changes what it can.
+    // A list that is too short or too long changes the characters it covers.
     m_panel->panel->changeSize({30}, 1);
     QCOMPARE(m_panel->sent.last().style.textItems()[0]->getFontSize(), 30);
     QCOMPARE(m_panel->sent.last().style.textItems()[1]->getFontSize(), 44);
@@ -319,7 +319,7 @@ void tst_texttoolspanel::mixedSelectionShows()
     QCOMPARE(box<SizeToolBox>()->findChild<QLineEdit*>()->text(), QStringLiteral("40+"));
     QCOMPARE(box<BoldToolBox>()->getFontBold(), 0);
     QCOMPARE(box<ItalicToolBox>()->getFontItalic(), 0);
-    // The last character counts for the rest.
+    // The style of the last character is used for the rest.
     QCOMPARE(box<TextColorToolBox>()->getColor(), QStringLiteral("#FFF700"));
     QVERIFY(box<EdgeToolBox>()->isEdgeOn());
     QCOMPARE(box<EdgeToolBox>()->getColor(), QStringLiteral("#C80000"));
@@ -383,7 +383,8 @@ void tst_texttoolspanel::previewKeepsTheSlidersPlace()
     for (TextStyle* item : text.textItems())
         item->setIsTextEdge(1);
     m_panel->select(text);
-    // The canvas answers a preview with what it has; a wider edge than the slider's would throw the handle.
+    // The canvas answers a preview with its own value; an edge wider than the slider's range would move the
+    // handle.
     connect(m_panel->panel, &TextToolsPanel::textStyleChange, this, [this](TText* style, int id, int) {
         TText answer(*style);
         if (id == 6)
@@ -503,7 +504,7 @@ void tst_texttoolspanel::styleIsRemembered()
     QCOMPARE(remembered.getAlign(), 1);
     QCOMPARE(remembered.getEdge(), 1);
     QCOMPARE(remembered.getKerning(), 110);
-    // The next session shows it, disabled.
+    // The next session shows the value, disabled.
     m_panel->panel->initTextToolsPanel();
     QCOMPARE(box<SizeToolBox>()->fontSizes(), QList<int>{66});
     QCOMPARE(box<BoldToolBox>()->getFontBold(), 1);

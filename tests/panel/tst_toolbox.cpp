@@ -199,7 +199,7 @@ void tst_toolbox::kerningShowsItsLevelWhenEnabled()
         QCOMPARE(button("Icon_KerningSmaller")->isEnabled(), smaller);
         QCOMPARE(button("Icon_KerningLarger")->isEnabled(), larger);
     }
-    // A spacing that is no level joins at the lower end.
+    // A spacing between two levels is raised from the lower level.
     QSignalSpy spy(box, &KerningToolBox::kerningChange);
     tap("Icon_KerningSmaller");
     QCOMPARE(spy, (QList<QVariantList>{{0, 10}}));
@@ -357,7 +357,7 @@ void tst_toolbox::edgeSliderClosesByATouchBeside()
     QSignalSpy spy(box, &EdgeToolBox::edgeChange);
     tap("EdgeWidth");
     QTRY_VERIFY(box->sliderIsShown());
-    tap("Icon_EdgeOff"); // closes the slider and presses nothing
+    tap("Icon_EdgeOff"); // closes the slider and does not press a button
     QVERIFY(!box->sliderIsShown());
     QVERIFY(spy.isEmpty());
     tap("Icon_EdgeOff");
@@ -376,7 +376,7 @@ void tst_toolbox::edgeSliderHasNoCorners()
     edge->hideEdgeSliderMenu();
 }
 
-// No word stands on a line alone when it could have company.
+// No line has a single word if another break avoids it.
 void tst_toolbox::rangeOfMoveBreaksInTheMiddle()
 {
     m_window->setStyleSheet(QStringLiteral(" * {font-family:'KST';}")); // as the window does
@@ -477,7 +477,7 @@ void tst_toolbox::pressedLookOnly()
     QTest::touchEvent(right, m_environment->device).press(0, center, right);
     QCOMPARE(right->paintedState(), KSPushbutton::ButtonPressed);
     QVERIFY(spy.isEmpty());
-    // A finger that slides off lets go without choosing.
+    // A finger that slides off the button does not choose it.
     QTest::touchEvent(right, m_environment->device).move(0, center + QPoint(0, 200), right);
     QTest::touchEvent(right, m_environment->device).release(0, center + QPoint(0, 200), right);
     QCOMPARE(right->paintedState(), KSPushbutton::ButtonRest);

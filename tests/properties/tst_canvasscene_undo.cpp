@@ -35,7 +35,7 @@ constexpr int DEFAULT_EDITS = 1000;
 constexpr int DEFAULT_EDITS = 10000;
 #endif
 constexpr int DEFAULT_SEED = 20231;
-// As in the window.
+// The undo limit of the window.
 constexpr int WINDOW_UNDO_LIMIT = 25;
 constexpr int FOCUS_COMMAND_ID = 1;
 
@@ -76,7 +76,7 @@ QString fileOf(const Canvas& canvas)
     return xml.left(begin) + opening + texts.join(opening) + xml.mid(end);
 }
 
-// The first lines that differ, with where they are; empty when none does.
+// Returns the first lines that differ, with their numbers; empty if there are none.
 QString difference(const QString& now, const QString& then)
 {
     const QStringList a = now.split(QLatin1Char('\n'));
@@ -134,7 +134,7 @@ QList<TText> someTexts()
     return {first, second};
 }
 
-// What is known of one object at one place of the stack.
+// The expected state of one object at one place of the stack.
 struct Object {
     explicit Object(GraphicsText* item) : typing(item->isTyping())
     {
@@ -212,7 +212,7 @@ public:
             if (!wrong.isEmpty())
                 return QString("place %1, object %2: %3").arg(m_index).arg(id).arg(wrong);
         }
-        // Steps to come may cut off the place that it was carried from.
+        // Later steps may cut off the place of the stack from which it was carried.
         edited();
         return {};
     }
@@ -239,7 +239,7 @@ private:
         std::set<std::pair<int, QString>> carried;
     };
 
-    // Steps of other objects, and moves, leave alone what an object carries.
+    // Steps of other objects, and moves, do not change the carried state of an object.
     bool wasCarried(int id, const Object& object) const
     {
         const auto unchangedAt = [&](int index) {
@@ -262,7 +262,7 @@ private:
     {
         m_places.resize(size_t(m_index) + 1, Place({}));
         Objects shown = objectsOf(m_canvas);
-        // What is being typed is no step yet; undo goes back behind it.
+        // Unfinished typing is not an undo step yet; undo goes back to before it.
         for (auto& [id, object] : shown) {
             const auto before = m_places.back().objects.find(id);
             if (object.typing && before != m_places.back().objects.end())
@@ -280,7 +280,7 @@ private:
     int m_index = 0;
 };
 
-// Where a run stands: the documents, the file, the picture.
+// The state of a run: the documents, the file, the picture.
 struct End {
     explicit End(const Canvas& canvas) : file(fileOf(canvas)), picture(pictureOf(canvas))
     {
@@ -319,7 +319,7 @@ void tst_canvasscene_undo::initTestCase()
     qRegisterMetaType<TText*>("TText*");
     m_edits = runLength("TITLER_EDITS", DEFAULT_EDITS);
     qInfo("seed %u, %d edits", quint32(RandomSeed(DEFAULT_SEED)), m_edits);
-    // A line for every save would be all that is to be seen.
+    // Hides the log lines for saving, which would fill the output.
     qInstallMessageHandler(ignoreDebug);
 }
 
@@ -467,7 +467,7 @@ void tst_canvasscene_undo::focusCommandsOnACleanStack()
     }
     operator_.leave();
     compare(End(canvas), end);
-    // No command of the canvas is taken for one of these, and none swallows another.
+    // No command of the canvas has the same id, and no two of them are merged.
     QVERIFY(ids.size() >= steps);
     QCOMPARE(ids.count(-1), ids.size());
     push(new FocusCommand);

@@ -52,13 +52,13 @@ private:
     QString randomName() { return m_names.at(random(int(m_names.size()))); }
     int random(int bound) { return int(m_random.bounded(quint32(bound))); }
     QString folderOf(const QString& name) const { return m_fixture.userRoot() + '/' + name; }
-    // As it is told by others: the folder, with a slash or not, or a file in it.
+    // Returns the path as other processes report it: the folder, with or without a slash, or a file in it.
     QString pathOf(const QString& name)
     {
         static const char* const ends[] = {"", "/", "/Titler.xml", "/Titler_240.png", "/Titler"};
         return folderOf(name) + QLatin1String(ends[random(5)]);
     }
-    // Files get ages of their own: the order at a start is that of their times.
+    // Gives each file a time of its own, since the order at a start is that of the times.
     void makeYoungest(const QString& name);
     void forget(const QString& name);
     TemplateTab* tab() const { return m_picker->userTab(); }
@@ -137,7 +137,7 @@ void tst_templatepicker_steps::startPicker()
     m_picker.reset();
     UserTemplateManager::cleanUp();
     m_picker = std::make_unique<TemplatePicker>();
-    m_picker->show(); // only then its parts have their places
+    m_picker->show(); // its parts are laid out only then
     m_picker->showUserTemplateTab();
 }
 

@@ -47,7 +47,7 @@ QString describe(const std::vector<TText*>& texts)
     return description;
 }
 
-// The first lines that differ; empty when none does.
+// Returns the first lines that differ; empty if there are none.
 QString difference(const QString& now, const QString& then)
 {
     const QStringList a = now.split(QLatin1Char('\n'));
@@ -144,7 +144,7 @@ QString tst_titlerwindow_editmonkey::writeFolder()
     return folder;
 }
 
-// The texts that are not shown where their record says; empty when all are.
+// Returns the texts that are not at the place in their record; empty if there are none.
 QString tst_titlerwindow_editmonkey::misplaced() const
 {
     QStringList wrong;
@@ -158,7 +158,7 @@ QString tst_titlerwindow_editmonkey::misplaced() const
     return wrong.join('\n');
 }
 
-// What holds at any moment.
+// Checks what must be true at any moment.
 void tst_titlerwindow_editmonkey::look(int touches) const
 {
     const QList<GraphicsText*> texts = scene()->getTextItemList();
@@ -222,7 +222,7 @@ void tst_titlerwindow_editmonkey::manyTouches()
         QVERIFY(file.open(QIODevice::WriteOnly));
         file.write(describe(shown).toUtf8());
     }
-    // The same title written again is the same file.
+    // Writing the same title again gives the same file.
     const QByteArray written = bytesOf(path);
     QVERIFY(TitleParser().writeOneTitle(&saved));
     QCOMPARE(bytesOf(path), written);

@@ -209,11 +209,11 @@ void tst_titlerwindow_library::initTestCase()
             m_redo = action;
     }
     QVERIFY(m_list && m_scene && m_picker && m_bar && m_undo && m_redo);
-    // Nobody looks at the window: what it would paint costs more than all the rest.
+    // Painting is switched off, since it would cost more than everything else and is not looked at.
     m_window->setUpdatesEnabled(false);
     m_picker->setUpdatesEnabled(false);
     connect(m_scene, &CanvasScene::signalPushUndoCommandIntoStack, this, [this] { ++m_textCommands; });
-    // The dialog runs an event loop of its own: what is to be done in it is done from there.
+    // The dialog runs an event loop of its own, in which the action is carried out.
     auto* watch = new QTimer(this);
     connect(watch, &QTimer::timeout, this, [this] {
         if (!m_picker->isVisible())
@@ -430,7 +430,7 @@ bool tst_titlerwindow_library::saveAsTemplate()
         return true;
     const int row = randomRow();
     const QString stem = m_model.order.at(row);
-    // The title on the canvas is waited for by the second.
+    // The window polls the title on the canvas once a second.
     const bool waits = stem == m_model.selected && (m_model.pictureNeeded || m_pending);
     if (waits && random(5) != 0)
         return true;
@@ -526,7 +526,7 @@ bool tst_titlerwindow_library::newText()
     type(item, QStringLiteral("新%1").arg(++m_typed));
     m_pending = *made;
     if (random(3) == 0)
-        return true; // what comes next ends it
+        return true; // the next action ends it
     return leaveText();
 }
 
@@ -601,7 +601,7 @@ bool tst_titlerwindow_library::redoStep()
 bool tst_titlerwindow_library::closeAndReopen()
 {
     m_doing = "close and reopen";
-    // Most of the times all is written already; else the window waits by the second.
+    // Usually everything is written already; otherwise the window polls once a second.
     if (random(4) != 0 && (!focusTitle() || !waitForPictures()))
         return false;
     if (!leaveText(false, [this] { m_window->saveCurrentTitle(); }))
@@ -609,7 +609,7 @@ bool tst_titlerwindow_library::closeAndReopen()
     m_window->closeTitlerWindow();
     m_model.leave();
     CHECK(!m_window->isVisible());
-    // Now that nothing can be brought back, the folder holds what the list held, and no picture beside it.
+    // Undo is not possible any more, so the folder holds the titles of the list and no other pictures.
     QStringList stems;
     for (const QString& file : QDir(m_folder).entryList(QDir::Files))
         stems << file.section('_', 0, 0).section('.', 0, 0);
@@ -696,8 +696,8 @@ bool tst_titlerwindow_library::verify()
     return verifyFiles(false) && verifyPictures();
 }
 
-// All that can be brought back lies on disk as the model has it; without all, only what was written anew is
-// read.
+// Compares all titles that exist or can be restored with the files on the disk; without "all" only the files
+// written since the last call are read.
 bool tst_titlerwindow_library::verifyFiles(bool all)
 {
     for (const QString& stem : m_model.reachable()) {
@@ -718,7 +718,7 @@ bool tst_titlerwindow_library::verifyFiles(bool all)
     return true;
 }
 
-// Titles with the same texts have the same pictures, whichever way they came to them.
+// Titles with the same texts have the same pictures, whatever edits led to them.
 bool tst_titlerwindow_library::verifyPictures()
 {
     if (!m_scene->isEditFinish())
@@ -758,7 +758,7 @@ bool tst_titlerwindow_library::verifyPictures()
     return true;
 }
 
-// What the file manager was told adds up to what lies in the folder.
+// The reports to the file manager add up to the files in the folder.
 bool tst_titlerwindow_library::verifyNotices()
 {
     const QSet<QString> wanted(m_model.order.begin(), m_model.order.end());

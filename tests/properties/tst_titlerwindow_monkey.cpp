@@ -24,7 +24,7 @@
 #include <sys/eventfd.h>
 #include <unistd.h>
 
-// The program waits for its pictures by the second; here it looks again at once.
+// The program polls its pictures once a second; here it polls again immediately.
 extern "C" unsigned int sleep(unsigned int)
 {
     ::usleep(2000);
@@ -228,7 +228,7 @@ void tst_titlerwindow_monkey::countWhatHappens()
     qApp->installEventFilter(this);
 }
 
-// At the moment of the commit: what it was about is forgotten afterwards.
+// Called during the commit, since its details are cleared afterwards.
 void tst_titlerwindow_monkey::countFolderEdits()
 {
     const FolderPicker* picker = folders();
@@ -261,7 +261,7 @@ void tst_titlerwindow_monkey::turn()
         stop();
 }
 
-// Where everything is to happen, what is rare is waited for.
+// A full run goes on until the rare events have happened, too.
 bool tst_titlerwindow_monkey::isEnough() const
 {
     const int touches = m_fingers->touches();
@@ -326,7 +326,7 @@ void tst_titlerwindow_monkey::fail(const QString& what)
                     .arg(what, m_fingers->lastTouches().join('\n'));
 }
 
-// What holds at any moment.
+// Checks what must be true at any moment.
 QString tst_titlerwindow_monkey::glance() const
 {
     const QList<GraphicsText*> texts = scene()->getTextItemList();
@@ -340,7 +340,7 @@ QString tst_titlerwindow_monkey::glance() const
     return list()->getMoveState() ? QString() : glanceAtList();
 }
 
-// The list, its records and the order file tell the same.
+// The list, its records and the order file agree.
 QString tst_titlerwindow_monkey::glanceAtList() const
 {
     const QString folder = list()->getCurrentPath();
@@ -389,7 +389,7 @@ void tst_titlerwindow_monkey::manyTouches()
     QCOMPARE(lookAtDisk(true), QString());
     QEventLoop loop;
     m_loop = &loop;
-    // Something to read at every turn.
+    // Writes a byte, so that every turn of the event loop has something to read.
     const int always = ::eventfd(1, EFD_CLOEXEC);
     QVERIFY(always >= 0);
     {

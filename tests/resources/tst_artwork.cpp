@@ -13,8 +13,8 @@ namespace
 
 constexpr double ENABLED_CONTRAST = 4.5;
 constexpr double DISABLED_CONTRAST = 2.0;
-// Between any two states: the mean colour of a face, and the colour of a patch of a mark, so large that it is
-// seen from an arm's length.
+// The smallest differences between two states: of the mean colour of a face, and of the colour of a patch of
+// a mark that is large enough to be seen from an arm's length.
 constexpr double FACE_DIFFERENCE = 8.0;
 constexpr double MARK_DIFFERENCE = 16.0;
 constexpr double SHAPE_DIFFERENCE = 12.0; // where only the shape changes
@@ -178,7 +178,7 @@ void tst_artwork::iconsShareOneSize()
         // In the middle of the picture.
         QVERIFY2(qAbs(rect.center().x() - (icon.width() - 1) / 2.0) <= 3.5,
                  qPrintable(QStringLiteral("%1: %2").arg(name).arg(rect.center().x())));
-        // Sharp: most of what is drawn is fully drawn.
+        // The icon is sharp: most of its pixels are opaque.
         int touched = 0;
         int full = 0;
         for (int y = rect.top(); y <= rect.bottom(); ++y) {
