@@ -639,7 +639,7 @@ void tst_canvasscene::savesAtOnce()
     QCOMPARE(first.textItems()[1]->getText(), std::string("😀"));
     QCOMPARE(first.textItems()[2]->getText(), std::string());
     QCOMPARE(canvas.log.fast, 1);
-    // Opening what was saved shows the same.
+    // A saved title is shown unchanged when it is opened again.
     canvas.scene->slotUpdateArchive(saved.get());
     QCOMPARE(canvas.text(1)->toPlainText(), QString::fromUtf8("a😀\nb"));
     QVERIFY(inStep(*canvas.text(1)));

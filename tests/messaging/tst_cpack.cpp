@@ -47,7 +47,7 @@ QByteArray packed(Function function)
     return bytes;
 }
 
-// Reads from heap memory of exactly the message's size, so that a sanitizer sees every byte too far.
+// Reads from heap memory of exactly the message's size, so that a sanitizer reports any read beyond it.
 unsigned long readValue(const QByteArray& message, unpack_info_t* info)
 {
     const auto size = static_cast<std::size_t>(message.size());

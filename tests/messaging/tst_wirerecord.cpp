@@ -15,7 +15,7 @@
 namespace
 {
 
-// Heap memory of exactly the message's size, so that a sanitizer sees every byte too far.
+// Heap memory of exactly the message's size, so that a sanitizer reports any read beyond it.
 class Message
 {
 public:

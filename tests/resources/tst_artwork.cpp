@@ -578,7 +578,7 @@ void tst_artwork::lightFallsFromAbove()
         const QImage image = face(panelButton(state));
         QVERIFY(image.pixelColor(4, 3).lightness() > image.pixelColor(4, image.height() - 4).lightness());
     }
-    // What is sunk has its shade above.
+    // A sunken shape has its shadow at the top.
     const QImage box = face(QStringLiteral(":/TextToolPanel_TextBox/TextBox_Edittable_"));
     QVERIFY(box.pixelColor(4, 1).lightness() < box.pixelColor(4, box.height() - 2).lightness());
     const QImage groove(QStringLiteral(":/Separator_H"));

@@ -404,7 +404,7 @@ void tst_titlerwindow_palette::previewLeavesNothing()
     QVERIFY(last.getEdgePoint()->getEdgeColor() != GREEN);
 }
 
-// A width that the slider shows is the operator's choice, whatever closes the slider.
+// The width that the slider shows is kept, whatever closes the slider.
 void tst_titlerwindow_palette::sliderIsCommittedFirst()
 {
     tap(centerOf(1));

@@ -100,7 +100,7 @@ void tst_ksscrollviewerwidget_move::dropAtEdgeScrollsDown()
     QCOMPARE(m->value(), m->maximum());
     QCOMPARE(m->clock.running(), 0);
     m->takeLog();
-    // Up again.
+    // Moves the item up again.
     m->press(50, 450);
     m->clock.advance(50);
     QCOMPARE(m->takeLog(), Names{"lifted 2"});
