@@ -3,6 +3,7 @@ import random
 import signal
 import threading
 import time
+import unittest
 import unittest.mock
 
 import harness
@@ -24,7 +25,8 @@ class MortalTitler:
 
         patch = unittest.mock.patch.object(harness.session, "wait_until", wait)
         patch.start()
-        self.addCleanup(patch.stop)
+        # As soon as the test is over: the harness's own clean-up comes later, while the next test runs.
+        unittest.TestCase.addCleanup(self, patch.stop)
         super().setUp()
 
     def wait_call(self, service, method, start, timeout=20):
