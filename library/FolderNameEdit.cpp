@@ -291,16 +291,20 @@ bool FolderNameEdit::makeFolder(const QString& name, const QModelIndex& index)
 {
     const bool isCopy = m_action == FOLDER_EDIT_DUPLICATE;
     const QString root = m_rows->regetRootPath();
+    const QString path = m_rows->folderPath(name);
+    const bool existed = QFileInfo(path).isDir(); // created by another process meanwhile
     const bool made = isCopy ? m_rows->disk().duplicateFolder(root, m_duplicateSource, name)
                              : m_rows->disk().createFolder(root, name);
     setRow(index, name);
     m_rows->insertChildrenIndex(index, name);
-    if (!QFileInfo(m_rows->folderPath(name)).isDir()) {
+    const bool exists = QFileInfo(path).isDir();
+    if (!exists)
         m_committed = false; // the row is removed when the editor is closed
+    // A disk that refuses everything also refuses the removal of a partial copy.
+    if (!exists || (!made && !existed))
         ListMessages::post(isCopy ? MessageDef::MESSAGE_DISK_FULL_ON_DUPLICATE
                                   : MessageDef::MESSAGE_DISK_FULL_ON_CREATE,
                            QCoreApplication::translate("FolderPicker", "folder"));
-    }
     return made;
 }
 

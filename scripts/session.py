@@ -121,6 +121,8 @@ class Process:
 
     def stop(self, timeout=10):
         self.signal(signal.SIGTERM)
+        if self.running():
+            self.popen.send_signal(signal.SIGCONT)  # a test may have stopped it
         try:
             self.popen.wait(deadline_after(timeout) - time.monotonic())
         except subprocess.TimeoutExpired:

@@ -1,6 +1,7 @@
 """For tests that kill the titler in the middle of its work."""
 import signal
 import threading
+import unittest
 import unittest.mock
 
 import harness
@@ -22,7 +23,8 @@ class MortalTitler:
 
         patch = unittest.mock.patch.object(harness.session, "wait_until", wait)
         patch.start()
-        self.addCleanup(patch.stop)
+        # As soon as the test is over: the harness's own clean-up comes later, while the next test runs.
+        unittest.TestCase.addCleanup(self, patch.stop)
         super().setUp()
 
     def wait_call(self, service, method, start, timeout=20):

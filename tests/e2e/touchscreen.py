@@ -97,7 +97,7 @@ class TouchDevice:
 
     def __init__(self, path):
         self.socket = socket.socket(socket.AF_UNIX)
-        self.socket.settimeout(20)
+        self.socket.settimeout(120)
         session.wait_until(lambda: os.path.exists(path), 20, "the touch device")
         self.socket.connect(path)
         self.socket.sendall(struct.pack("<IIHH", 12, CLIENT_VERSION, *PROTOCOL))

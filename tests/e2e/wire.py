@@ -35,7 +35,7 @@ def frame(method, payload, receiver=peer.TITLER_RECEIVER, target=TITLER_OBJECT, 
 class Connection:
     """A connection to the titler. Acknowledgements are read and counted, but never waited for."""
 
-    def __init__(self, offset, timeout=20):
+    def __init__(self, offset, timeout=120):
         self.timeout = timeout * harness.SLOW
         self.socket = socket.create_connection(("127.0.0.1", peer.TITLER_PORT + offset), self.timeout)
         self.acknowledged = 0
@@ -71,7 +71,7 @@ class Asker:
     CLIENT, RECEIVER = 1001, 2
     ADAPTER = 9
 
-    def __init__(self, offset, timeout=20):
+    def __init__(self, offset, timeout=120):
         self.listener = socket.create_server(("127.0.0.1", self.CLIENT + offset))
         self.listener.settimeout(timeout * harness.SLOW)
         self.calls = Connection(offset, timeout)

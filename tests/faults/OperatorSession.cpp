@@ -2,6 +2,7 @@
 
 #include "FaultShim.h"
 #include "app/APPEventFilter.h"
+#include "app/ShowMessageController.h"
 #include "app/TitlerWindow.h"
 #include "canvas/CanvasScene.h"
 #include "canvas/GraphicsText.h"
@@ -43,6 +44,7 @@ namespace
 {
 
 constexpr long MESSAGE_CENTER = 65;
+constexpr int MOST_ARRIVAL = 20000; // ms; of a call at the sibling
 // ms. Where the disk refuses, titles may never be saved: once that was seen, less is waited for it.
 constexpr int SETTLE_TIMEOUT = 3000;
 constexpr int SETTLE_TIMEOUT_LATER = 300;
@@ -139,12 +141,20 @@ void OperatorSession::report(const char* phase, const char* name, const Journal:
                     {"hit", QString::fromLocal8Bit(FaultShim::hit())}});
 }
 
-// The numbers of the messages that the operator was shown.
+// Returns the numbers of the messages that the operator was shown. They arrive through a socket: waits for a
+// call that is sent behind them.
 QJsonArray OperatorSession::told() const
 {
+    using Proxy = MessageCenterRemoteProxy;
+    const qsizetype before = m_siblings.countOf(MESSAGE_CENTER, Proxy::METHOD_setTopWindow);
+    ShowMessageController::getInstance()->changeTopWindow(MessageDefine::TOP_WINDOW_TITLER);
+    QElapsedTimer waiting;
+    waiting.start();
+    while (m_siblings.countOf(MESSAGE_CENTER, Proxy::METHOD_setTopWindow) == before &&
+           !waiting.hasExpired(MOST_ARRIVAL))
+        QThread::msleep(1);
     QJsonArray numbers;
-    for (QByteArray arguments :
-         m_siblings.argumentsOf(MESSAGE_CENTER, MessageCenterRemoteProxy::METHOD_postMessage)) {
+    for (QByteArray arguments : m_siblings.argumentsOf(MESSAGE_CENTER, Proxy::METHOD_postMessage)) {
         MessageDefine::_tagMessageParam message;
         MessageCenterParams::deserialize_postMessage_param(message, arguments.data(), long(arguments.size()));
         numbers.append(message.messageId);
