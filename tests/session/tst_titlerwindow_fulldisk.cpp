@@ -209,7 +209,7 @@ void tst_titlerwindow_fulldisk::closeAsksBeforeWorkIsLost()
         QTRY_COMPARE(boxes(117).size(), 1);
         QVERIFY2(boxes(117).front().contains(QString::fromUtf8("\"a 快讯\"")),
                  qPrintable(boxes(117).front()));
-        QTRY_COMPARE(boxes(114), QStringList{"File"});                    // one message, whatever number of writes was refused
+        QTRY_COMPARE(boxes(114), QStringList{"File"}); // one message, whatever number of writes was refused
         m_window->continueCloseTitler({1, MessageDefine::CLOSE_OK, 114}); // another box
         QVERIFY(m_window->isVisible());
         answer(MessageDefine::CLOSE_OK);
