@@ -9,6 +9,7 @@ void ScrollViewerPress::begin(Pointer by, const QPoint& position, int value)
     pointer = by;
     press = position;
     last = position;
+    current = position;
     valueAtPress = value;
     moved = false;
     outOfBounds = false;

@@ -35,7 +35,8 @@ public:
     int index = -1;
     QPoint positionInItem = QPoint(-1, -1); // in item coordinates
     QPoint press;
-    QPoint last;
+    QPoint last;    // up to where the list or the lifted item has followed
+    QPoint current; // where the pointer was seen last
     int valueAtPress = 0;
     int upperBound = 0;
     int lowerBound = 0;

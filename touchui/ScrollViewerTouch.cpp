@@ -256,6 +256,7 @@ void ScrollViewerTouch::fingerMoved(const QPoint& pos)
 
 void ScrollViewerTouch::reportMove(const QPoint& pos)
 {
+    m_press.current = pos;
     if (m_press.item)
         Q_EMIT movedOver(m_press.item, inPressedItem(pos));
 }
@@ -419,6 +420,10 @@ void ScrollViewerTouch::startDrag()
     m_drag.lift(item, m_dragAlignment, parent, position);
     m_list.viewport()->grabMouse();
     Q_EMIT dragStarted();
+    // The item was lifted where the pointer was put down. A pointer that moved since may not move again.
+    m_press.last = m_press.press;
+    if (m_press.current != m_press.press)
+        moveDragItem(m_press.current);
 }
 
 int ScrollViewerTouch::overhang() const

@@ -7,6 +7,7 @@ ORDER_NOTICE = ("FileManagerController", "updateTitlerOrder")
 # The middle of the handle of the first title in move mode, and the Move button, in pixels of the screen.
 HANDLE = (540, 133)
 MOVE = (520, 36)
+BESIDE_LIST = (566, 70, 590, 230)
 # From the middle of a folder's row in the picker to what opens it.
 EXPANDER = (-95, 0)
 
@@ -59,9 +60,13 @@ class LibraryTest(harness.TitlerTest):
 
     def lift(self):
         """In move mode, puts a finger on the handle of the first title until it is lifted."""
-        before = self.display.frame()
+        def beside():
+            """What is on the right of the list, where only a lifted title reaches."""
+            return self.part(*BESIDE_LIST)
+
+        before = beside()
         self.display.down(*HANDLE)
-        harness.session.wait_until(lambda: self.display.frame() != before, 20 * harness.SLOW, "the lifted title")
+        harness.session.wait_until(lambda: beside() != before, 20 * harness.SLOW, "the lifted title")
 
     def carry_to(self, y):
         for place in range(HANDLE[1], y, 15):

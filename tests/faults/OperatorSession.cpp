@@ -142,16 +142,20 @@ void OperatorSession::report(const char* phase, const char* name, const Journal:
 }
 
 // Returns the numbers of the messages that the operator was shown. They arrive through a socket: waits for a
-// call that is sent behind them.
-QJsonArray OperatorSession::told() const
+// call that is sent behind them and that no other call equals.
+QJsonArray OperatorSession::told()
 {
     using Proxy = MessageCenterRemoteProxy;
-    const qsizetype before = m_siblings.countOf(MESSAGE_CENTER, Proxy::METHOD_setTopWindow);
-    ShowMessageController::getInstance()->changeTopWindow(MessageDefine::TOP_WINDOW_TITLER);
-    QElapsedTimer waiting;
-    waiting.start();
-    while (m_siblings.countOf(MESSAGE_CENTER, Proxy::METHOD_setTopWindow) == before &&
-           !waiting.hasExpired(MOST_ARRIVAL))
+    const auto mark = static_cast<MessageDefine::_emTopWindow>(++m_lastMark);
+    ShowMessageController::getInstance()->changeTopWindow(mark);
+    const QDeadlineTimer limit(MOST_ARRIVAL);
+    const auto hasArrived = [&] {
+        QByteArray arguments = m_siblings.lastArguments(MESSAGE_CENTER, Proxy::METHOD_setTopWindow);
+        MessageDefine::_tagTopWindowParam window{};
+        MessageCenterParams::deserialize_setTopWindow_param(window, arguments.data(), long(arguments.size()));
+        return window.topWindow == mark;
+    };
+    while (!hasArrived() && !limit.hasExpired())
         QThread::msleep(1);
     QJsonArray numbers;
     for (QByteArray arguments : m_siblings.argumentsOf(MESSAGE_CENTER, Proxy::METHOD_postMessage)) {

@@ -56,7 +56,7 @@ private:
     void report(const char* phase, const char* name, const Journal::Folders& folders);
     Journal::Folders seen() const;
     void noteList();
-    QJsonArray told() const;
+    QJsonArray told();
 
     void request(const QString& folder);
     void inEditor(bool healBeforeClose);
@@ -88,6 +88,7 @@ private:
     std::function<void()> m_inFolders;
     std::function<void()> m_inTemplates;
     QString m_open;           // name of the open folder
+    int m_lastMark = 1000;    // above every window number that the program itself tells
     bool m_isSlow = false;    // whether something was not saved in time
     Journal::Folders m_known; // as last seen by the operator
 };

@@ -22,7 +22,7 @@ namespace
 {
 
 const long PEER = 1000;
-// Far below the time for which a blocking call would wait for its peer, and enough for a busy machine.
+// Below the 10 s for which a blocking call would wait for its peer, and enough for a busy machine.
 const int MOST_GUI_MS = 8000;
 const int FLOOD = 3000;
 

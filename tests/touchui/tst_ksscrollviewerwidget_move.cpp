@@ -12,6 +12,8 @@ private Q_SLOTS:
     void liftAndDrop();
     void dropAtTheEnd();
     void dropAtTheSamePlace();
+    void fingerThatMovedBeforeTheLift();
+    void mouseThatMovedBeforeTheLift();
     void dropAtEdgeScrollsDown();
     void edgeScrollingFasterFarOut();
     void edgeScrollingStopsInside();
@@ -85,6 +87,45 @@ void tst_ksscrollviewerwidget_move::dropAtTheSamePlace()
     m->release(50, 270);
     QCOMPARE(m->order().mid(0, 4), (Names{"0", "1", "2", "3"}));
     QCOMPARE(m->takeLog().filter("dropped").size(), 1);
+}
+
+// On a busy machine all moves of a quick finger may be handled before the row is lifted.
+void tst_ksscrollviewerwidget_move::fingerThatMovedBeforeTheLift()
+{
+    m->m_list->setItemsDragFlagAlignment(DRAGFLAG_LEFT);
+    m->fill(20);
+    m->m_list->slotItemsCanDrag(true);
+    m->press(50, 50);
+    m->move(50, 150);
+    m->move(50, 364);
+    m->clock.advance(50);
+    QVERIFY(m->m_list->isDragging());
+    m->release(50, 364);
+    QCOMPARE(m->order().mid(0, 5), (Names{"1", "2", "3", "0", "4"}));
+
+    // A finger that is beyond the edge by then scrolls the list.
+    m->press(50, 50);
+    m->move(50, 150);
+    m->move(50, 480);
+    m->clock.advance(50 + 40 * 200);
+    QCOMPARE(m->value(), m->maximum());
+    m->release(50, 480);
+    QCOMPARE(m->order().constLast(), QStringLiteral("1"));
+}
+
+void tst_ksscrollviewerwidget_move::mouseThatMovedBeforeTheLift()
+{
+    m->m_list->setItemsDragFlagAlignment(DRAGFLAG_LEFT);
+    m->fill(4);
+    m->m_list->slotItemsCanDrag(true);
+    QWidget* row = m->m_list->getWidgetItem(0);
+    QTest::mousePress(row, Qt::LeftButton, Qt::NoModifier, QPoint(12, 50));
+    QTest::mouseMove(row, QPoint(12, 53));
+    QTest::mouseMove(row, QPoint(12, 260));
+    m->clock.advance(50);
+    QVERIFY(m->m_list->isDragging());
+    QTest::mouseRelease(m->m_list->viewport(), Qt::LeftButton, Qt::NoModifier, QPoint(50, 260));
+    QCOMPARE(m->order(), (Names{"1", "2", "0", "3"}));
 }
 
 void tst_ksscrollviewerwidget_move::dropAtEdgeScrollsDown()
