@@ -13,6 +13,7 @@
 #include "touchui/KSSoftKeyboardCursorSettingEvent.h"
 
 #include <QAbstractEventDispatcher>
+#include <QAbstractTextDocumentLayout>
 #include <QClipboard>
 #include <QGraphicsScene>
 #include <QGraphicsSceneContextMenuEvent>
@@ -22,6 +23,8 @@
 #include <QMimeData>
 #include <QPainter>
 #include <QStyleHints>
+#include <QStyleOptionGraphicsItem>
+#include <QTextBlock>
 #include <QTextCursor>
 #include <QTextDocument>
 #include <QTextOption>
@@ -80,6 +83,7 @@ void GraphicsText::initDataForGraphicsText()
 
     setFlag(ItemIsMovable);
     setFlag(ItemIsSelectable);
+    setFlag(ItemUsesExtendedStyleOption); // so that only what is exposed is painted
     setAcceptTouchEvents(true);
     // The frame is larger than the child. A finger on it must not drag the parent without the child.
     if (m_parentObject)
@@ -391,6 +395,26 @@ void GraphicsText::layoutChanged()
     update();
 }
 
+void GraphicsText::repaintBlock(int position)
+{
+    const QTextBlock block = document()->findBlock(position);
+    if (!block.isValid()) {
+        update();
+        return;
+    }
+    const QRectF lines = document()->documentLayout()->blockBoundingRect(block);
+    const double reach = lines.height() / 2.0 + HANDLEPIXMAPHEIGHT;
+    // The frame behind it is painted again with the scene.
+    QGraphicsTextItem::update(QRectF(layoutRect().left(), lines.top(), layoutRect().width(), lines.height())
+                                  .adjusted(-reach, -reach, reach, reach));
+}
+
+void GraphicsText::blockChanged(int position)
+{
+    m_painter->invalidate();
+    repaintBlock(position);
+}
+
 void GraphicsText::showShadow(const TShadow& shadow)
 {
     m_shadowEffect->setOffset(shadow.getShadowDirectionX() * canvasRatio(),
@@ -531,7 +555,7 @@ QRectF GraphicsText::boundingRect() const
     return layoutRect().united(child->layoutRect()).adjusted(-pen, -pen, pen, pen);
 }
 
-void GraphicsText::paint(QPainter* painter, const QStyleOptionGraphicsItem*, QWidget*)
+void GraphicsText::paint(QPainter* painter, const QStyleOptionGraphicsItem* option, QWidget*)
 {
     // The base class has nothing to paint: Qt's selection frame and the document's own caret are not wanted,
     // and its glyphs are transparent.
@@ -541,7 +565,7 @@ void GraphicsText::paint(QPainter* painter, const QStyleOptionGraphicsItem*, QWi
     } else {
         m_touchEditor->paintBelowGlyphs(painter);
         m_painter->drawSelection(painter, textCursor(), hasFocus());
-        m_painter->drawItemText(painter);
+        m_painter->drawItemText(painter, option ? option->exposedRect : boundingRect());
         if (getBoundingLineStatus() == FocusEdit)
             m_touchEditor->paintAboveGlyphs(painter);
     }

@@ -188,6 +188,8 @@ private:
     void announceGeometryChange() override;
     void layoutChanged() override;
     void repaint() override { update(); }
+    void repaintBlock(int position) override;
+    void blockChanged(int position) override;
     void showShadow(const TShadow& shadow) override;
 
     // ITextObjectListener

@@ -169,13 +169,13 @@ void TextPainter::drawItemTextOutLine(QPainter* painter, const QTransform& origi
     }
 }
 
-void TextPainter::drawItemText(QPainter* painter)
+void TextPainter::drawItemText(QPainter* painter, const QRectF& exposed)
 {
     collectGlyphs();
     const bool antialiasing = painter->testRenderHint(QPainter::Antialiasing);
     const QTransform origin = painter->worldTransform();
     painter->setRenderHint(QPainter::Antialiasing);
-    const QRectF visible = visibleArea(*painter);
+    const QRectF visible = visibleArea(*painter) & exposed.adjusted(-1.0, -1.0, 1.0, 1.0);
     drawItemTextOutLine(painter, origin, visible);
     for (const Step& step : m_steps) {
         if (!visible.intersects(step.reach))

@@ -40,7 +40,8 @@ public:
     quint64 contentVersion() const { return m_version; }
     CaretGeometry& carets() { return m_carets; }
 
-    void drawItemText(QPainter* painter);
+    // Draws at least what is in the exposed rectangle, in item coordinates.
+    void drawItemText(QPainter* painter, const QRectF& exposed);
     // Draws the frame of a pair: status is that of the child, FocusEdit or FocusObject.
     void drawItemBoundingRect(QPainter* painter, const QRectF& rect, int status);
     // Highlights the selection of the cursor; hasFocus chooses the colours.
