@@ -29,6 +29,7 @@
 #include <QTextDocument>
 #include <QTextOption>
 #include <algorithm>
+#include <utility>
 
 using namespace TextObjectConstants;
 
@@ -104,9 +105,13 @@ void GraphicsText::initDataForGraphicsText()
     setGraphicsEffect(m_shadowEffect);
 
     installEventFilter(this);
+    QAbstractTextDocumentLayout* layout = document()->documentLayout();
     const QObjectList parts = children();
-    for (QObject* part : parts)
+    for (QObject* part : parts) {
         part->installEventFilter(this);
+        disconnect(layout, &QAbstractTextDocumentLayout::update, part, nullptr);
+    }
+    connect(layout, &QAbstractTextDocumentLayout::update, this, &GraphicsText::repaintLayout);
     if (IInputLanguageSource* source = IInputLanguageSource::instance()) {
         connect(source, &IInputLanguageSource::signalsInputLanguageInfo, this,
                 &GraphicsText::slotObjectDisplayInputLanguage);
@@ -413,6 +418,16 @@ void GraphicsText::blockChanged(int position)
 {
     m_painter->invalidate();
     repaintBlock(position);
+    m_isBlockRepainted = true;
+}
+
+// At the end of an edit the layout requests a repaint of everything, because it finds nothing left to do: the
+// block was laid out when its formats were applied. That is the request after blockChanged().
+void GraphicsText::repaintLayout(const QRectF& area)
+{
+    const bool isEverything = area.topLeft().isNull() && area.height() > layoutRect().height();
+    if (!std::exchange(m_isBlockRepainted, false) || !isEverything)
+        QGraphicsTextItem::update(area);
 }
 
 void GraphicsText::showShadow(const TShadow& shadow)

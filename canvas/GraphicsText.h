@@ -190,6 +190,7 @@ private:
     void repaint() override { update(); }
     void repaintBlock(int position) override;
     void blockChanged(int position) override;
+    void repaintLayout(const QRectF& area);
     void showShadow(const TShadow& shadow) override;
 
     // ITextObjectListener
@@ -219,6 +220,7 @@ private:
     // Owned by the item, see setGraphicsEffect().
     QGraphicsDropShadowEffect* m_shadowEffect = nullptr;
     int m_focusFlag = TextObjectConstants::FocusNone;
+    bool m_isBlockRepainted = false; // until the layout requests to repaint everything
     bool m_parentObject = false;
     bool m_bigScene = false;
     bool m_boundingRectFlag = false;

@@ -194,6 +194,5 @@ private Q_SLOTS:
     }
 };
 
-Q_DECLARE_METATYPE(std::function<void(QPainter&)>)
 QTEST_MAIN(tst_glyphmasks)
 #include "tst_glyphmasks.moc"
