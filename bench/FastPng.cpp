@@ -30,7 +30,8 @@ void addChunk(QByteArray& bytes, const char* type, const QByteArray& data)
 
 } // namespace
 
-FastPng::FastPng(Filter filter, int level) : m_filter(filter), m_compressor(libdeflate_alloc_compressor(level))
+FastPng::FastPng(Filter filter, int level)
+    : m_filter(filter), m_compressor(libdeflate_alloc_compressor(level))
 {
 }
 

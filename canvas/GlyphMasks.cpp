@@ -109,9 +109,9 @@ void fillMasked(QPainter& painter, const GlyphPath& glyph, int penWidth, const Q
         // Smaller than the cache, so that it stays.
         masks.insert(key, made.release(), static_cast<int>(mask->image.sizeInBytes()) + int(sizeof(Mask)));
     }
-    painter.drawImage(QPointF(x.pixel + mask->offset.x() - transform.dx(),
-                              y.pixel + mask->offset.y() - transform.dy()),
-                      mask->image);
+    painter.drawImage(
+        QPointF(x.pixel + mask->offset.x() - transform.dx(), y.pixel + mask->offset.y() - transform.dy()),
+        mask->image);
 }
 
 } // namespace

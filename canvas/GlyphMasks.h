@@ -9,9 +9,9 @@ class QPainter;
 // pixel: drawing a picture takes a small part of the time of filling the path. Places are told apart to 1/64
 // pixel, so that a pixel at an edge may differ by a few levels from that of the path.
 //
-// The pictures used last are kept, up to 16 MB in this process. The path itself is filled where a picture does
-// not serve: with a painter that is not antialiased, that scales or turns or does not draw pixels, and for
-// very large shapes. GUI thread only.
+// The pictures used last are kept, up to 16 MB in this process. The path itself is filled where a picture
+// does not serve: with a painter that is not antialiased, that scales or turns or does not draw pixels, and
+// for very large shapes. GUI thread only.
 class GlyphMasks
 {
 public:

@@ -40,8 +40,8 @@ public:
     // Repaints the paragraph at the position and what its caret and outlines cover around it; everything if
     // there is none.
     virtual void repaintBlock(int position) = 0;
-    // Call after characters of one paragraph changed and the layout of the others did not: as layoutChanged(),
-    // but repaints that paragraph only.
+    // Call after characters of one paragraph changed and the layout of the others did not: as
+    // layoutChanged(), but repaints that paragraph only.
     virtual void blockChanged(int position) = 0;
     // Shows the shadow; an offset of (0,0) switches it off.
     virtual void showShadow(const TShadow& shadow) = 0;

@@ -90,10 +90,9 @@ template <std::size_t N>
 std::array<Code, N> codesFor(const std::array<std::uint32_t, N>& counts, unsigned maxBits)
 {
     std::vector<std::pair<std::uint32_t, std::size_t>> used; // count and symbol
-    for (std::size_t symbol = 0; symbol < N; ++symbol) {
+    for (std::size_t symbol = 0; symbol < N; ++symbol)
         if (counts[symbol] > 0)
             used.emplace_back(counts[symbol], symbol);
-    }
     std::sort(used.begin(), used.end());
     std::vector<std::uint32_t> weights(used.size());
     std::vector<std::uint32_t> lengths;

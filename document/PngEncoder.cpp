@@ -31,10 +31,9 @@ std::array<std::unique_ptr<PngStrip>, MAX_THREADS> gSpare;
 std::unique_ptr<PngStrip> takeSpare()
 {
     const std::lock_guard lock(gMutex);
-    for (auto& spare : gSpare) {
+    for (auto& spare : gSpare)
         if (spare)
             return std::move(spare);
-    }
     return std::make_unique<PngStrip>();
 }
 

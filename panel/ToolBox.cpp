@@ -168,7 +168,8 @@ void ToolBox::setButtonChosen(KSPushbutton* button)
         showIcon(*entry);
 }
 
-// Reads and decodes each icon file once. From a name without suffix, an icon would read the database of MIME types.
+// Reads and decodes each icon file once. From a name without suffix, an icon would read the database of MIME
+// types.
 QIcon ToolBox::iconOf(Button& entry, const QString& name)
 {
     auto known = entry.icons.find(name);

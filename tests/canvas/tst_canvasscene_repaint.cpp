@@ -69,10 +69,7 @@ private Q_SLOTS:
 
 private:
     // Returns what is on the screen, without painting anything.
-    QImage onScreen() const
-    {
-        return m_canvas->view.screen()->grabWindow(m_canvas->view.winId()).toImage();
-    }
+    QImage onScreen() const { return m_canvas->view.screen()->grabWindow(m_canvas->view.winId()).toImage(); }
     void openLines(const QStringList& lines, int align, bool outlined);
     void bring(const QString& state);
     // Paints everything that is due.

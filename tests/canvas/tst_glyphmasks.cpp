@@ -23,8 +23,7 @@ std::shared_ptr<const GlyphPath> glyph(const QString& text, int pixelSize = 60)
     return GlyphPathCache::glyph(font, text);
 }
 
-QImage drawn(QPointF baseline, const std::function<void(QPainter&)>& draw,
-             QSize size = QSize(200, 120))
+QImage drawn(QPointF baseline, const std::function<void(QPainter&)>& draw, QSize size = QSize(200, 120))
 {
     QImage image(size, QImage::Format_ARGB32_Premultiplied);
     image.fill(QColor(40, 90, 60));
@@ -60,8 +59,8 @@ private Q_SLOTS:
     void drawsWhatThePathDraws_data()
     {
         QTest::addColumn<QString>("text");
-        for (const QString& text : {QStringLiteral("A"), QStringLiteral("g"), QStringLiteral("\u5feb"),
-                                    QStringLiteral("e\u0301")})
+        for (const QString& text :
+             {QStringLiteral("A"), QStringLiteral("g"), QStringLiteral("\u5feb"), QStringLiteral("e\u0301")})
             QTest::newRow(qPrintable(text)) << text;
     }
 

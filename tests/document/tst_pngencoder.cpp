@@ -139,10 +139,9 @@ QImage randomPicture(QRandomGenerator& random)
                                  1 + random.bounded(size.width()), 1 + random.bounded(size.height()))
                                .intersected(image.rect());
         const auto content = static_cast<Content>(random.bounded(6));
-        for (int y = area.top(); y <= area.bottom(); ++y) {
+        for (int y = area.top(); y <= area.bottom(); ++y)
             for (int x = area.left(); x <= area.right(); ++x)
                 image.setPixel(x, y, pixel(content, x, y, random));
-        }
     }
     return image.convertToFormat(FORMATS[random.bounded(quint32(FORMATS.size()))]);
 }
@@ -169,13 +168,12 @@ private Q_SLOTS:
     {
         QTest::addColumn<Content>("content");
         QTest::addColumn<QImage::Format>("format");
-        for (const QImage::Format format : FORMATS) {
+        for (const QImage::Format format : FORMATS)
             for (const auto& [name, content] :
                  {std::pair("transparent", Content::Transparent), std::pair("even", Content::Even),
                   std::pair("noise", Content::Noise), std::pair("photograph", Content::Photograph),
                   std::pair("text", Content::Text), std::pair("steps", Content::Steps)})
                 QTest::addRow("%s, format %d", name, format) << content << format;
-        }
     }
 
     // Small ones, and those around the lengths at which comparisons, repetitions and strips end.
@@ -184,10 +182,9 @@ private Q_SLOTS:
         QFETCH(Content, content);
         QFETCH(QImage::Format, format);
         std::vector<QSize> sizes;
-        for (int width = 1; width <= 20; ++width) {
+        for (int width = 1; width <= 20; ++width)
             for (int height = 1; height <= 6; ++height)
                 sizes.emplace_back(width, height);
-        }
         for (const int width : {63,   64,   65,   66,   85,   86,    87,    88,    127,   128,   129,
                                 172,  173,  240,  257,  258,  259,   516,   517,   960,   1920,  2047,
                                 2048, 8190, 8191, 8192, 8193, 10922, 10923, 40000, 65535, 65536, 65537})
