@@ -18,20 +18,23 @@ namespace
 constexpr int CACHE_BYTES = 16 * 1024 * 1024;
 constexpr double LARGEST_PICTURE = 1024 * 1024; // pixels
 constexpr double FARTHEST = 1 << 20;            // pixels, of a baseline from the device's origin
-constexpr int PHASES = 64;                      // places within a pixel, in each direction
+// Places within a pixel, in each direction. So many that a picture is what the path would be: the raster
+// engine rounds to 1/64 pixel, and an object has few places at a time.
+constexpr int PHASES = 1 << 24;
 
 struct MaskKey {
     quint64 glyph;
     int penWidth;
     QRgb color;
-    int phase;
+    int phaseX;
+    int phaseY;
 
     bool operator==(const MaskKey&) const = default;
 };
 
 size_t qHash(const MaskKey& key, size_t seed)
 {
-    return qHashMulti(seed, key.glyph, key.penWidth, key.color, key.phase);
+    return qHashMulti(seed, key.glyph, key.penWidth, key.color, key.phaseX, key.phaseY);
 }
 
 struct Mask {
@@ -41,9 +44,9 @@ struct Mask {
 
 // A coordinate as a whole pixel and the phase in it.
 struct Place {
+    // Never beyond the value: the raster engine rounds up from the middle between two of its places.
     explicit Place(double value)
-        : pixel(static_cast<int>(std::floor(value + 0.5 / PHASES)))
-        , phase(static_cast<int>((value + 0.5 / PHASES - pixel) * PHASES))
+        : pixel(static_cast<int>(std::floor(value))), phase(static_cast<int>((value - pixel) * PHASES))
     {
     }
 
@@ -96,7 +99,7 @@ void fillMasked(QPainter& painter, const GlyphPath& glyph, int penWidth, const Q
     }
     const Place x(transform.dx());
     const Place y(transform.dy());
-    const MaskKey key{glyph.id(), penWidth, color.rgba(), x.phase * PHASES + y.phase};
+    const MaskKey key{glyph.id(), penWidth, color.rgba(), x.phase, y.phase};
     const Mask* mask = masks.object(key);
     if (!mask) {
         std::unique_ptr<Mask> made =

@@ -6,8 +6,8 @@ class GlyphPath;
 class QPainter;
 
 // Fills the shapes of glyphs from pictures that are drawn once for each shape, colour and place within a
-// pixel: drawing a picture takes a small part of the time of filling the path. Places are told apart to 1/64
-// pixel, so that a pixel at an edge may differ by a few levels from that of the path.
+// pixel: drawing a picture takes a small part of the time of filling the path. Pixels at an edge may differ
+// from those of the path by a rounding.
 //
 // The pictures used last are kept, up to 16 MB in this process. The path itself is filled where a picture
 // does not serve: with a painter that is not antialiased, that scales or turns or does not draw pixels, and
