@@ -4,6 +4,8 @@
 #include "messaging/ptc/SocketFrame.h"
 #include "messaging/ptc/WorkerSignals.h"
 
+#include <boost/thread.hpp>
+
 #include <netinet/in.h>
 #include <netinet/tcp.h>
 #include <sys/socket.h>

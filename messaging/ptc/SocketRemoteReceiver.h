@@ -2,13 +2,16 @@
 
 #include "messaging/ptc/RemoteReceiver.h"
 
-#include <boost/thread.hpp>
-
 #include <atomic>
 #include <deque>
 #include <list>
 #include <memory>
 #include <mutex>
+
+namespace boost
+{
+class thread;
+}
 
 // Listens on 127.0.0.1 and converts the frames of every connection to event packets.
 //
