@@ -334,8 +334,8 @@ void GraphicsText::keyboardClosed()
 
 void GraphicsText::slotObjectDocumentChange(int position, int removed, int added)
 {
-    m_painter->invalidate();
-    m_styleEditor->documentChanged(position, removed, added);
+    if (!m_styleEditor->documentChanged(position, removed, added))
+        m_painter->invalidate();
 }
 
 void GraphicsText::slotObjectPositionChanged()

@@ -107,8 +107,9 @@ void TextItemSurface::parentFollows()
     QTextDocument& frame = *parent->document();
     if (frame.defaultTextOption().alignment() != option.alignment())
         frame.setDefaultTextOption(option);
-    if (frame.textWidth() != m_item.textWidth())
-        frame.setTextWidth(m_item.textWidth());
+    // The child has no text width of its own while its lines begin at the left margin.
+    if (frame.textWidth() != m_item.layoutRect().width())
+        frame.setTextWidth(m_item.layoutRect().width());
     parent->update();
 }
 
@@ -135,8 +136,11 @@ void TextItemSurface::repaintBlock(int position)
 
 void TextItemSurface::blockChanged(int position)
 {
-    m_painter.invalidate();
-    repaintBlock(position);
+    const QTextBlock block = m_item.document()->findBlock(position);
+    if (m_painter.invalidateParagraph(block.blockNumber()))
+        repaintBlock(position);
+    else
+        m_item.update();
     m_isBlockRepainted = true;
 }
 

@@ -90,17 +90,17 @@ void TextStyleEditor::resetDocument(const TText& record, int cursorPosition)
 
 // Typing
 
-void TextStyleEditor::documentChanged(int position, int removed, int added)
+bool TextStyleEditor::documentChanged(int position, int removed, int added)
 {
     if (m_guard > 0 || (removed == 0 && added == 0))
-        return;
+        return false;
     // The document includes its last paragraph break in the count when it is filled for the first time.
     removed = std::clamp(removed, 0, std::max(m_styles.count() - position, 0));
     added = std::max(documentLength(m_document) - (m_styles.count() - removed), 0);
     added = cutOffCharsBeyondMaxNum(position, added);
     trimUnchanged(position, removed, added);
     if (removed == 0 && added == 0)
-        return;
+        return false;
 
     m_listener.textTyped();
     m_undoFlag = 1;
@@ -117,11 +117,12 @@ void TextStyleEditor::documentChanged(int position, int removed, int added)
     reconcile();
     if (previewTakenBack) {
         const Guard guard(*this);
-        m_layout.applyFormats(0, m_styles.count());
+        m_layout.applyStyles(0, m_styles.count());
         m_layout.updateWidthAndAlign();
     }
     showCurrentTextStyle();
     m_listener.textTyped();
+    return true;
 }
 
 void TextStyleEditor::repairTexts(int begin, int end)
@@ -264,7 +265,7 @@ void TextStyleEditor::charsRemovedChange(int position, int count)
         m_layout.setCaretHeight(*m_styles.lastAlpha().textItems().front());
     repairTexts(position - 1, position + 1);
     m_layout.finishLayout();
-    m_layout.updateWidthAndAlign();
+    m_layout.updateAfterTyping(position);
     applyShadow();
 }
 
@@ -380,7 +381,7 @@ void TextStyleEditor::cancelPreview()
     if (!m_styles.takeBackPreview())
         return;
     const Guard guard(*this);
-    m_layout.applyFormats(0, m_styles.count());
+    m_layout.applyStyles(0, m_styles.count());
     m_layout.updateWidthAndAlign();
     applyShadow();
     m_undoFlag = CommittedChange;
@@ -400,7 +401,7 @@ void TextStyleEditor::changeSelectionProperty(int id, const TText& source, int f
         StyleDocument::setCharacterProperty(id, *m_styles.at(i), *given[size_t(i - begin)]);
         ensureFamily(*m_styles.at(i));
     }
-    m_layout.applyFormats(begin, end);
+    m_layout.applyStyles(begin, end);
     m_layout.updateWidthAndAlign();
 }
 

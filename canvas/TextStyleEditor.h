@@ -19,8 +19,9 @@ public:
     void initShowText();
     void resetDocument(const TText& record, int cursorPosition);
 
-    // Call when the document reports a change; changes made by this class are ignored.
-    void documentChanged(int position, int removed, int added);
+    // Call when the document reports a change; changes made by this class are ignored. Returns whether the
+    // surface was informed of what has to be drawn anew.
+    bool documentChanged(int position, int removed, int added);
 
     void changeAllStyleWhenSelectionMode(const TText& source, int id, bool overall, int undoFlag);
     void changeAllStyleWhenHasSelection(const TText& source, int id);
