@@ -334,8 +334,11 @@ void GraphicsText::keyboardClosed()
 
 void GraphicsText::slotObjectDocumentChange(int position, int removed, int added)
 {
-    if (!m_styleEditor->documentChanged(position, removed, added))
+    m_surface->beginChange();
+    const bool isRepainted = m_styleEditor->documentChanged(position, removed, added);
+    if (!isRepainted)
         m_painter->invalidate();
+    m_surface->endChange(isRepainted);
 }
 
 void GraphicsText::slotObjectPositionChanged()
@@ -395,7 +398,7 @@ void GraphicsText::paint(QPainter* painter, const QStyleOptionGraphicsItem* opti
     // and its glyphs are transparent.
     painter->save();
     if (m_parentObject) {
-        paintFrame(painter);
+        paintFrame(painter, option ? option->exposedRect : boundingRect());
     } else {
         m_touchEditor->paintBelowGlyphs(painter);
         m_painter->drawSelection(painter, textCursor(), hasFocus());
@@ -406,12 +409,12 @@ void GraphicsText::paint(QPainter* painter, const QStyleOptionGraphicsItem* opti
     painter->restore();
 }
 
-void GraphicsText::paintFrame(QPainter* painter)
+void GraphicsText::paintFrame(QPainter* painter, const QRectF& exposed)
 {
     const GraphicsText* child = childTextItem();
     const int status = child ? child->getBoundingLineStatus() : FocusNone;
     if (status == FocusObject || (status == FocusEdit && child->getFocusFlag() == FocusEdit))
-        m_painter->drawItemBoundingRect(painter, child->boundingRect(), status);
+        m_painter->drawItemBoundingRect(painter, child->boundingRect(), status, exposed);
 }
 
 // Events

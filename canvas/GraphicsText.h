@@ -8,9 +8,9 @@
 #include <QRectF>
 #include <memory>
 
-class ITextSurface;
 class QGraphicsDropShadowEffect;
 class StyleDocument;
+class TextItemSurface;
 class TextPainter;
 class TextStyle;
 class TextStyleEditor;
@@ -144,12 +144,12 @@ private:
     // Called when the operator closed the keyboard.
     void keyboardClosed();
     QRectF limitedBoundingRect() const;
-    void paintFrame(QPainter* painter);
+    void paintFrame(QPainter* painter, const QRectF& exposed);
 
     std::unique_ptr<StyleDocument> m_styles;
     std::unique_ptr<TextPainter> m_painter;
     TextPlacement m_placement;
-    std::unique_ptr<ITextSurface> m_surface;
+    std::unique_ptr<TextItemSurface> m_surface;
     std::unique_ptr<TextStyleEditor> m_styleEditor;
     std::unique_ptr<TouchTextEditor> m_touchEditor;
     // Owned by the item, see setGraphicsEffect().

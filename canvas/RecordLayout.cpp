@@ -6,7 +6,9 @@
 #include "canvas/TextObjectConstants.h"
 #include "canvas/TextPlacement.h"
 
+#include <QAbstractTextDocumentLayout>
 #include <QFontMetricsF>
+#include <QRectF>
 #include <QTextBlock>
 #include <QTextCursor>
 #include <QTextDocument>
@@ -20,6 +22,11 @@ using namespace TextObjectConstants;
 namespace
 {
 
+// How far an outline reaches beyond its glyph at a sharp corner, in pen widths.
+constexpr double SPIKE_OF_OUTLINE = 2.0;
+// Pixels around a paragraph that its caret and the antialiasing of its glyphs may cover.
+constexpr double GLYPH_REACH = 6.0;
+
 // Returns whether the document lays both styles out in the same way.
 bool sameLayout(const TextStyle& a, const TextStyle& b)
 {
@@ -31,6 +38,25 @@ bool sameLayout(const TextStyle& a, const TextStyle& b)
 double marginOf(double lineHeight)
 {
     return MARGIN_SHARE_OF_LINE * lineHeight / 2.0;
+}
+
+// Returns whether no character is written from right to left.
+bool isLeftToRight(const QString& text)
+{
+    return std::none_of(text.begin(), text.end(), [](QChar c) {
+        switch (c.direction()) {
+        case QChar::DirR:
+        case QChar::DirAL:
+        case QChar::DirAN:
+        case QChar::DirRLE:
+        case QChar::DirRLO:
+        case QChar::DirRLI:
+        case QChar::DirFSI:
+            return true;
+        default:
+            return c.isSurrogate();
+        }
+    });
 }
 
 bool isMargin(const QTextBlockFormat& format, double margin)
@@ -66,7 +92,9 @@ double RecordLayout::expectedMargin() const
         if (previous && sameLayout(*previous, *style))
             continue;
         const QFont font = CharacterFormat::font(*style, m_parts.surface.canvasRatio());
-        tallest = std::max(tallest, QFontMetricsF(font).height());
+        const QFontMetricsF metrics(font);
+        const double height = metrics.ascent() + metrics.descent() + std::max(0.0, metrics.leading());
+        tallest = std::max(tallest, std::ceil(height)); // as in the layout
         previous = style;
     }
     return marginOf(tallest);
@@ -177,12 +205,42 @@ void RecordLayout::updateWidthAndAlign()
     m_parts.surface.layoutChanged();
 }
 
-void RecordLayout::updateAfterTyping(int position)
+void RecordLayout::updateAfterTyping(int position, int added)
 {
     if (isFitted())
-        m_parts.surface.blockChanged(position);
+        m_parts.surface.blockChanged(m_parts.document.findBlock(position).blockNumber(),
+                                     areaOfTyping(position, added));
     else
         updateWidthAndAlign();
+}
+
+// Returns where the paragraph may look different, in item coordinates. What stands before the word stays
+// where it is if the text runs from left to right and begins at the left margin.
+QRectF RecordLayout::areaOfTyping(int position, int added) const
+{
+    const QTextDocument& document = m_parts.document;
+    const QTextBlock block = document.findBlock(position);
+    const QString text = block.text();
+    const QRectF lines = document.documentLayout()->blockBoundingRect(block);
+    QRectF area(0.0, lines.top(), document.size().width(), lines.height());
+    if (alignmentOf(m_parts.styles.current()) == Qt::AlignLeft && block.layout()->lineCount() == 1 &&
+        isLeftToRight(text)) {
+        const QTextLine line = block.layout()->lineAt(0);
+        const double left = block.layout()->position().x();
+        const int column = position - block.position();
+        const qsizetype space = column > 1 ? text.lastIndexOf(QLatin1Char(' '), column - 2) : -1;
+        area.setLeft(left + line.cursorToX(int(space + 1)));
+        if (added > 0)
+            area.setRight(left + line.cursorToX(int(text.size())));
+    }
+    int widest = 0;
+    for (int i = block.position(); i < block.position() + int(text.size()); ++i) {
+        const TextStyle* style = m_parts.styles.at(i);
+        if (style && style->isTextEdge())
+            widest = std::max(widest, CharacterFormat::outlineWidth(*style, m_parts.surface.canvasRatio()));
+    }
+    const double reach = lines.height() / 2.0 + SPIKE_OF_OUTLINE * widest + GLYPH_REACH;
+    return area.adjusted(-reach, -reach, reach, reach);
 }
 
 // Returns whether updateWidthAndAlign() would leave everything as it is.

@@ -2,6 +2,7 @@
 
 #include "canvas/TextObjectParts.h"
 
+class QRectF;
 class QTextCursor;
 class TextStyle;
 
@@ -27,9 +28,9 @@ public:
     // Fits margins, width and alignment to the text. An object that is centred or aligned right keeps its
     // centre or its right edge where it was at the last call.
     void updateWidthAndAlign();
-    // As above, after characters were added or removed at the position: repaints their paragraph only, if the
-    // object keeps its size and its paragraphs.
-    void updateAfterTyping(int position);
+    // As above, after characters were added at the position or removed there (added is 0): repaints what of
+    // their paragraph changed, if the object keeps its size and its paragraphs.
+    void updateAfterTyping(int position, int added);
     // Makes the next call of updateWidthAndAlign() leave the object where it is.
     void forgetWidth() { m_lastWidth = 0.0; }
     // Call after characters were removed: the document reports the removal before it has laid itself out.
@@ -44,6 +45,7 @@ private:
     // Returns the text width that the document needs.
     double textWidthFor(double width) const;
     bool isFitted() const;
+    QRectF areaOfTyping(int position, int added) const;
     void setFormats(QTextCursor& cursor, int begin, int end);
     void adjustLeftAndRightMargin(double margin);
     void setDocumentAlign();

@@ -1,18 +1,22 @@
 #include "canvas/TextItemSurface.h"
 
-#include "canvas/TextObjectConstants.h"
 #include "canvas/TextPainter.h"
+#include "canvas/TouchState.h"
 #include "canvas/TouchTextItem.h"
 #include "document/TShadow.h"
 
 #include <QAbstractTextDocumentLayout>
 #include <QGraphicsDropShadowEffect>
-#include <QTextBlock>
 #include <QTextDocument>
 #include <QTextOption>
-#include <utility>
 
-using namespace TextObjectConstants;
+namespace
+{
+
+// How far the caret is painted beyond its line.
+constexpr double CARET_REACH = 6.0;
+
+} // namespace
 
 TextItemSurface::TextItemSurface(TouchTextItem& item, TextPainter& painter,
                                  QGraphicsDropShadowEffect& shadowEffect)
@@ -25,6 +29,10 @@ TextItemSurface::TextItemSurface(TouchTextItem& item, TextPainter& painter,
         QObject::disconnect(layout, &QAbstractTextDocumentLayout::update, part, nullptr);
     QObject::connect(layout, &QAbstractTextDocumentLayout::update, &m_item,
                      [this](const QRectF& area) { repaintLayout(area); });
+    QObject::connect(m_item.document(), &QTextDocument::contentsChanged, &m_item, [this] {
+        if (m_requests == LayoutRequests::LastIgnored)
+            m_requests = LayoutRequests::Followed; // the edit has ended without a request
+    });
 }
 
 TouchTextItem* TextItemSurface::parentOfPair() const
@@ -118,39 +126,46 @@ void TextItemSurface::repaint()
     m_item.update();
 }
 
-void TextItemSurface::repaintBlock(int position)
+void TextItemSurface::repaintCaret(int position)
 {
-    const QTextDocument& document = *m_item.document();
-    const QTextBlock block = document.findBlock(position);
-    if (!block.isValid()) {
-        m_item.update();
+    TouchState::End caret;
+    if (!m_painter.carets().caretPoint(caret.line, caret.point, caret.block, position))
         return;
-    }
-    const QRectF whole = m_item.layoutRect();
-    const QRectF lines = document.documentLayout()->blockBoundingRect(block);
-    const double reach = lines.height() / 2.0 + HANDLEPIXMAPHEIGHT;
     // The frame behind it is painted again with the scene.
-    m_item.QGraphicsTextItem::update(QRectF(whole.left(), lines.top(), whole.width(), lines.height())
-                                         .adjusted(-reach, -reach, reach, reach));
+    m_item.QGraphicsTextItem::update(QRectF(caret.line.p1(), caret.line.p2())
+                                         .adjusted(-CARET_REACH, -CARET_REACH, CARET_REACH, CARET_REACH));
 }
 
-void TextItemSurface::blockChanged(int position)
+void TextItemSurface::blockChanged(int block, const QRectF& area)
 {
-    const QTextBlock block = m_item.document()->findBlock(position);
-    if (m_painter.invalidateParagraph(block.blockNumber()))
-        repaintBlock(position);
+    if (m_painter.invalidateParagraph(block))
+        m_item.QGraphicsTextItem::update(area);
     else
         m_item.update();
-    m_isBlockRepainted = true;
 }
 
-// At the end of an edit the layout requests a repaint of everything, because it finds nothing left to do: the
-// block was laid out when its formats were applied. That is the request after blockChanged().
+void TextItemSurface::beginChange()
+{
+    m_requests = LayoutRequests::Ignored;
+}
+
+void TextItemSurface::endChange(bool isRepainted)
+{
+    m_requests = isRepainted ? LayoutRequests::LastIgnored : LayoutRequests::Followed;
+}
+
 void TextItemSurface::repaintLayout(const QRectF& area)
 {
-    const bool isEverything = area.topLeft().isNull() && area.height() > m_item.layoutRect().height();
-    if (!std::exchange(m_isBlockRepainted, false) || !isEverything)
+    switch (m_requests) {
+    case LayoutRequests::Followed:
         m_item.QGraphicsTextItem::update(area);
+        break;
+    case LayoutRequests::Ignored:
+        break;
+    case LayoutRequests::LastIgnored:
+        m_requests = LayoutRequests::Followed;
+        break;
+    }
 }
 
 void TextItemSurface::showShadow(const TShadow& shadow)

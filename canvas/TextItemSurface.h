@@ -31,11 +31,25 @@ public:
     void layoutChanged() override;
     void parentFollows() override;
     void repaint() override;
-    void repaintBlock(int position) override;
-    void blockChanged(int position) override;
+    void repaintCaret(int position) override;
+    void blockChanged(int block, const QRectF& area) override;
     void showShadow(const TShadow& shadow) override;
 
+    // Call when the document reports a change, before and after it is read back: what the layout requests to
+    // repaint in between, and at the end of the edit, is left to layoutChanged() and blockChanged().
+    // isRepainted: whether one of them was called.
+    void beginChange();
+    void endChange(bool isRepainted);
+
 private:
+    // What happens when the layout requests a repaint.
+    enum class LayoutRequests {
+        Followed,
+        Ignored,    // while a change is read back
+        LastIgnored // at the end of the edit the layout requests everything, since it finds nothing left to
+                    // do
+    };
+
     TouchTextItem* parentOfPair() const;
     // Called when the layout requests to repaint an area, in item coordinates.
     void repaintLayout(const QRectF& area);
@@ -43,5 +57,5 @@ private:
     TouchTextItem& m_item;
     TextPainter& m_painter;
     QGraphicsDropShadowEffect& m_shadowEffect;
-    bool m_isBlockRepainted = false; // until the layout requests to repaint everything
+    LayoutRequests m_requests = LayoutRequests::Followed;
 };

@@ -90,12 +90,16 @@ void TextPainter::drawItemText(QPainter* painter, const QRectF& exposed)
     painter->setRenderHint(QPainter::Antialiasing, antialiasing);
 }
 
-void TextPainter::drawItemBoundingRect(QPainter* painter, const QRectF& rect, int status)
+void TextPainter::drawItemBoundingRect(QPainter* painter, const QRectF& rect, int status,
+                                       const QRectF& exposed)
 {
     prepareFrame(rect);
     painter->setRenderHint(QPainter::Antialiasing, false);
     painter->fillRect(m_frame.rect, status == FocusObject ? SELECTED_FILL : EDIT_FILL);
     painter->setRenderHint(QPainter::Antialiasing);
+    constexpr double inside = ITEMBOUNDINGWIDTH;
+    if (m_frame.rect.adjusted(inside, inside, -inside, -inside).contains(exposed))
+        return; // nothing of the line
     if (status == FocusObject) {
         painter->fillPath(m_frame.solid, QColor(ITEMBOUNDINGSOLIDCOLOR));
         return;

@@ -36,8 +36,9 @@ public:
 
     // Draws at least what is in the exposed rectangle, in item coordinates.
     void drawItemText(QPainter* painter, const QRectF& exposed);
-    // Draws the frame of a pair: status is that of the child, FocusEdit or FocusObject.
-    void drawItemBoundingRect(QPainter* painter, const QRectF& rect, int status);
+    // Draws at least what is in the exposed rectangle of the frame of a pair: status is that of the child,
+    // FocusEdit or FocusObject.
+    void drawItemBoundingRect(QPainter* painter, const QRectF& rect, int status, const QRectF& exposed);
     // Highlights the selection of the cursor; hasFocus chooses the colours.
     void drawSelection(QPainter* painter, const QTextCursor& cursor, bool hasFocus);
 

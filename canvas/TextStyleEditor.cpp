@@ -61,11 +61,21 @@ void TextStyleEditor::ensureFamily(TextStyle& style)
     m_listener.familyReplaced(wanted);
 }
 
+void TextStyleEditor::ensureFamilies(int begin, int end)
+{
+    const TextStyle* previous = nullptr;
+    for (int i = begin; i < end; ++i) {
+        TextStyle* style = m_styles.at(i);
+        if (!previous || previous->getFontFamily() != style->getFontFamily())
+            ensureFamily(*style);
+        previous = style;
+    }
+}
+
 void TextStyleEditor::initShowText()
 {
     const Guard guard(*this);
-    for (TextStyle* style : m_styles.current().textItems())
-        ensureFamily(*style);
+    ensureFamilies(0, m_styles.count());
     m_layout.insertRecord();
     if (m_styles.isEmpty() && !m_styles.lastAlpha().textItems().empty())
         m_layout.setCaretHeight(*m_styles.lastAlpha().textItems().front());
@@ -246,7 +256,7 @@ void TextStyleEditor::charsAddedChange(int position, int added)
     m_layout.applyFormats(position, position + int(text.size()));
     if (!m_styles.isEmpty())
         m_layout.setCaretHeight(*m_styles.at(0));
-    m_layout.updateAfterTyping(position);
+    m_layout.updateAfterTyping(position, int(text.size()));
     applyShadow();
     m_styles.forgetNextInsert();
 }
@@ -265,7 +275,7 @@ void TextStyleEditor::charsRemovedChange(int position, int count)
         m_layout.setCaretHeight(*m_styles.lastAlpha().textItems().front());
     repairTexts(position - 1, position + 1);
     m_layout.finishLayout();
-    m_layout.updateAfterTyping(position);
+    m_layout.updateAfterTyping(position, 0);
     applyShadow();
 }
 
@@ -397,10 +407,9 @@ void TextStyleEditor::changeSelectionProperty(int id, const TText& source, int f
     const auto& given = source.textItems();
     const int begin = std::min(from, to);
     const int end = std::min({std::max(from, to), begin + int(given.size()), m_styles.count()});
-    for (int i = begin; i < end; ++i) {
+    for (int i = begin; i < end; ++i)
         StyleDocument::setCharacterProperty(id, *m_styles.at(i), *given[size_t(i - begin)]);
-        ensureFamily(*m_styles.at(i));
-    }
+    ensureFamilies(begin, end);
     m_layout.applyStyles(begin, end);
     m_layout.updateWidthAndAlign();
 }

@@ -55,8 +55,9 @@ public:
 private:
     class Guard;
 
-    // Replaces a missing family and reports it.
+    // Replace missing families and report them, for one style or those from begin to before end.
     void ensureFamily(TextStyle& style);
+    void ensureFamilies(int begin, int end);
     int cutOffCharsBeyondMaxNum(int position, int added);
     // Narrows a reported change down to the characters that did change.
     void trimUnchanged(int& position, int& removed, int& added) const;

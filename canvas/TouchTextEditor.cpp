@@ -575,15 +575,15 @@ void TouchTextEditor::focusLost()
                       L"focus out focus position " + std::to_wstring(m_surface.selection().position()));
 }
 
-// Repaints what a key changed in the paragraphs of the old and the new caret.
+// Repaints the old and the new caret. The text that a key changed is repainted with its paragraph.
 void TouchTextEditor::repaintBetween(const QTextCursor& before, const QTextCursor& after)
 {
     if (before.hasSelection() || after.hasSelection() || m_state.handleCaret) {
         m_surface.repaint();
         return;
     }
-    m_surface.repaintBlock(before.position());
-    m_surface.repaintBlock(after.position());
+    m_surface.repaintCaret(before.position());
+    m_surface.repaintCaret(after.position());
 }
 
 void TouchTextEditor::setCursorPosition(int position)
