@@ -11,6 +11,8 @@
 #include <QPen>
 #include <algorithm>
 #include <cmath>
+#include <functional>
+#include <string>
 
 namespace
 {
@@ -34,9 +36,30 @@ size_t qHash(const FontKey& key, size_t seed)
     return qHashMulti(seed, key.family, key.pixelSize, key.kerning, key.bold, key.italic);
 }
 
+struct FormatKey {
+    FontKey font;
+    std::string color;
+    bool edge;
+
+    bool operator==(const FormatKey&) const = default;
+};
+
+size_t qHash(const FormatKey& key, size_t seed)
+{
+    return qHashMulti(qHash(key.font, seed), std::hash<std::string>()(key.color), key.edge);
+}
+
 struct FontStore {
     QHash<QString, bool> installed;
     QCache<FontKey, QFont> fonts{CACHED_FONTS};
+    QCache<FormatKey, QTextCharFormat> formats{CACHED_FONTS};
+
+    void clear()
+    {
+        installed.clear();
+        fonts.clear();
+        formats.clear();
+    }
 };
 
 FontStore& store()
@@ -46,13 +69,9 @@ FontStore& store()
     if (!connected && qGuiApp) {
         connected = true;
         // An imported font may make a missing family available.
-        QObject::connect(qGuiApp, &QGuiApplication::fontDatabaseChanged, qGuiApp, [] {
-            fontStore.installed.clear();
-            fontStore.fonts.clear();
-        });
+        QObject::connect(qGuiApp, &QGuiApplication::fontDatabaseChanged, qGuiApp, [] { fontStore.clear(); });
         QObject::connect(qGuiApp, &QObject::destroyed, [] {
-            fontStore.installed.clear();
-            fontStore.fonts.clear();
+            fontStore.clear();
             connected = false;
         });
     }
@@ -62,6 +81,12 @@ FontStore& store()
 int kerning(const TextStyle& style)
 {
     return std::clamp(style.getTextKerning(), 0, MAXIMUM_KERNING);
+}
+
+FontKey fontKey(const TextStyle& style, double ratio)
+{
+    return {QString::fromStdString(style.getFontFamily()), CharacterFormat::pixelSize(style, ratio),
+            kerning(style), style.isFontBold() != 0, style.isTextItalic() != 0};
 }
 
 } // namespace
@@ -90,8 +115,7 @@ int CharacterFormat::pixelSize(const TextStyle& style, double ratio)
 
 QFont CharacterFormat::font(const TextStyle& style, double ratio)
 {
-    const FontKey key{QString::fromStdString(style.getFontFamily()), pixelSize(style, ratio), kerning(style),
-                      style.isFontBold() != 0, style.isTextItalic() != 0};
+    const FontKey key = fontKey(style, ratio);
     auto& fonts = store().fonts;
     if (const QFont* known = fonts.object(key))
         return *known;
@@ -106,18 +130,23 @@ QFont CharacterFormat::font(const TextStyle& style, double ratio)
 
 QTextCharFormat CharacterFormat::layoutFormat(const TextStyle& style, double ratio)
 {
+    const FormatKey key{fontKey(style, ratio), style.getFontColor(), style.isTextEdge() != 0};
+    auto& formats = store().formats;
+    if (const QTextCharFormat* known = formats.object(key))
+        return *known;
     QTextCharFormat format;
-    format.setFontFamilies({QString::fromStdString(style.getFontFamily())});
-    format.setProperty(QTextFormat::FontPixelSize, pixelSize(style, ratio));
-    format.setFontWeight(style.isFontBold() ? QFont::Bold : QFont::Normal);
-    format.setFontItalic(style.isTextItalic() != 0);
+    format.setFontFamilies({key.font.family});
+    format.setProperty(QTextFormat::FontPixelSize, key.font.pixelSize);
+    format.setFontWeight(key.font.bold ? QFont::Bold : QFont::Normal);
+    format.setFontItalic(key.font.italic);
     format.setFontLetterSpacingType(QFont::PercentageSpacing);
-    format.setFontLetterSpacing(kerning(style));
+    format.setFontLetterSpacing(key.font.kerning);
     QColor invisible = color(style.getFontColor());
     invisible.setAlpha(0);
     format.setForeground(QBrush(invisible));
-    if (!style.isTextEdge())
+    if (!key.edge)
         format.setTextOutline(QPen(Qt::NoPen));
+    formats.insert(key, new QTextCharFormat(format));
     return format;
 }
 

@@ -8,7 +8,7 @@
 
 class TextStyle;
 
-// Turns character styles into fonts and layout formats. All text objects share the fonts, which are cached by
+// Turns character styles into fonts and layout formats. All text objects share them; they are cached by
 // family, size, weight, slant and spacing, so that most characters need no query of the font database. GUI
 // thread only.
 class CharacterFormat

@@ -52,9 +52,11 @@ struct GlyphStore {
 
     QHash<QString, bool> pictureFonts; // by family
     QCache<GlyphKey, Entry> glyphs{CACHE_BYTES};
+    quint64 generation = 1;
 
     void clear()
     {
+        ++generation;
         pictureFonts.clear();
         glyphs.clear();
     }
@@ -184,4 +186,9 @@ std::shared_ptr<const GlyphPath> GlyphPathCache::glyph(const QFont& font, const 
     auto made = std::make_shared<const GlyphPath>(font, text);
     cache.insert(key, new GlyphStore::Entry(made), made->cost());
     return made;
+}
+
+quint64 GlyphPathCache::generation()
+{
+    return store().generation;
 }

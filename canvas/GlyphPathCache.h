@@ -57,4 +57,7 @@ class GlyphPathCache
 {
 public:
     static std::shared_ptr<const GlyphPath> glyph(const QFont& font, const QString& text);
+    // Returns a number that changes when fonts are imported or removed: glyphs made before may look
+    // different.
+    static quint64 generation();
 };

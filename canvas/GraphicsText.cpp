@@ -3,6 +3,8 @@
 #include "canvas/IInputLanguageSource.h"
 #include "canvas/InputLanguageFonts.h"
 #include "canvas/StyleDocument.h"
+#include "canvas/TextItemSurface.h"
+#include "canvas/TextObjectConstants.h"
 #include "canvas/TextObjectParts.h"
 #include "canvas/TextPainter.h"
 #include "canvas/TextShadowEffect.h"
@@ -12,49 +14,17 @@
 #include "touchui/KSInputContext.h"
 #include "touchui/KSSoftKeyboardCursorSettingEvent.h"
 
-#include <QAbstractEventDispatcher>
-#include <QAbstractTextDocumentLayout>
-#include <QClipboard>
 #include <QGraphicsScene>
-#include <QGraphicsSceneContextMenuEvent>
-#include <QGraphicsSceneMouseEvent>
-#include <QGuiApplication>
-#include <QKeyEvent>
-#include <QMimeData>
 #include <QPainter>
-#include <QStyleHints>
 #include <QStyleOptionGraphicsItem>
-#include <QTextBlock>
 #include <QTextCursor>
 #include <QTextDocument>
 #include <QTextOption>
-#include <algorithm>
-#include <utility>
 
 using namespace TextObjectConstants;
 
-namespace
-{
-
-// Returns whether the event is a blink of the document's own caret, which is not painted: it would only cause
-// repaints.
-bool isBlinkOfCaret(QObject* watched, const QEvent* event)
-{
-    if (event->type() != QEvent::Timer)
-        return false;
-    const int blink = QGuiApplication::styleHints()->cursorFlashTime() / 2;
-    const int id = static_cast<const QTimerEvent*>(event)->timerId();
-    const QList<QAbstractEventDispatcher::TimerInfo> timers =
-        QAbstractEventDispatcher::instance()->registeredTimers(watched);
-    return std::any_of(timers.begin(), timers.end(), [blink, id](const auto& timer) {
-        return timer.timerId == id && timer.interval == blink;
-    });
-}
-
-} // namespace
-
 GraphicsText::GraphicsText(TText* record, int id, QGraphicsItem* parent, QGraphicsScene* scene)
-    : QGraphicsTextItem(parent), m_styles(std::make_unique<StyleDocument>()), m_placement(*this)
+    : ReportingTextItem(parent), m_styles(std::make_unique<StyleDocument>()), m_placement(*this)
 {
     if (record)
         m_styles->setCurrent(*record);
@@ -66,7 +36,7 @@ GraphicsText::GraphicsText(TText* record, int id, QGraphicsItem* parent, QGraphi
 }
 
 GraphicsText::GraphicsText(bool parentObject, QGraphicsItem* parent, QGraphicsScene* scene)
-    : QGraphicsTextItem(parent)
+    : ReportingTextItem(parent)
     , m_styles(std::make_unique<StyleDocument>())
     , m_placement(*this)
     , m_parentObject(parentObject)
@@ -85,11 +55,9 @@ void GraphicsText::initDataForGraphicsText()
     setFlag(ItemIsMovable);
     setFlag(ItemIsSelectable);
     setFlag(ItemUsesExtendedStyleOption); // so that only what is exposed is painted
-    setAcceptTouchEvents(true);
     // The frame is larger than the child. A finger on it must not drag the parent without the child.
     if (m_parentObject)
         setAcceptedMouseButtons(Qt::NoButton);
-    setAcceptDrops(false);
     // Undo steps are formed from the records; the document's own undo would conflict with them.
     document()->setUndoRedoEnabled(false);
     document()->setDocumentMargin(DOCUMENT_MARGIN);
@@ -98,20 +66,6 @@ void GraphicsText::initDataForGraphicsText()
     option.setWrapMode(QTextOption::NoWrap);
     document()->setDefaultTextOption(option);
 
-    m_shadowEffect = new TextShadowEffect(*this);
-    m_shadowEffect->setColor(DROP_SHADOW_COLOR);
-    m_shadowEffect->setOffset(0.0, 0.0);
-    m_shadowEffect->setEnabled(false);
-    setGraphicsEffect(m_shadowEffect);
-
-    installEventFilter(this);
-    QAbstractTextDocumentLayout* layout = document()->documentLayout();
-    const QObjectList parts = children();
-    for (QObject* part : parts) {
-        part->installEventFilter(this);
-        disconnect(layout, &QAbstractTextDocumentLayout::update, part, nullptr);
-    }
-    connect(layout, &QAbstractTextDocumentLayout::update, this, &GraphicsText::repaintLayout);
     if (IInputLanguageSource* source = IInputLanguageSource::instance()) {
         connect(source, &IInputLanguageSource::signalsInputLanguageInfo, this,
                 &GraphicsText::slotObjectDisplayInputLanguage);
@@ -120,10 +74,19 @@ void GraphicsText::initDataForGraphicsText()
 
 void GraphicsText::makeUnits()
 {
+    m_shadowEffect = new TextShadowEffect(*this);
+    m_shadowEffect->setColor(DROP_SHADOW_COLOR);
+    m_shadowEffect->setOffset(0.0, 0.0);
+    m_shadowEffect->setEnabled(false);
+    setGraphicsEffect(m_shadowEffect);
+
     m_painter = std::make_unique<TextPainter>(*document(), *m_styles);
-    const TextObjectParts parts{*document(), *m_styles, m_painter->carets(), m_placement, *this, *this};
+    m_surface = std::make_unique<TextItemSurface>(*this, *m_painter, *m_shadowEffect);
+    const TextObjectParts parts{*document(), *m_styles, m_painter->carets(), m_placement, *m_surface, *this};
     m_styleEditor = std::make_unique<TextStyleEditor>(parts);
     m_touchEditor = std::make_unique<TouchTextEditor>(parts, *m_styleEditor);
+    if (!m_parentObject)
+        setInput(m_touchEditor.get());
     connect(&m_styleEditor->undoTimer(), &QTimer::timeout, this, &GraphicsText::slotUndoTimeOut);
     connect(&m_touchEditor->longPressTimer(), &QTimer::timeout, this, &GraphicsText::slotLongPressed);
 }
@@ -132,16 +95,15 @@ void GraphicsText::makeUnits()
 
 GraphicsText* GraphicsText::parentTextItem() const
 {
-    QGraphicsItem* parent = parentItem();
-    return parent && parent->type() == Type ? static_cast<GraphicsText*>(parent) : nullptr;
+    return qgraphicsitem_cast<GraphicsText*>(parentItem());
 }
 
 GraphicsText* GraphicsText::childTextItem() const
 {
     const QList<QGraphicsItem*> children = childItems();
     for (QGraphicsItem* child : children)
-        if (child->type() == Type)
-            return static_cast<GraphicsText*>(child);
+        if (auto* text = qgraphicsitem_cast<GraphicsText*>(child))
+            return text;
     return nullptr;
 }
 
@@ -150,33 +112,9 @@ bool GraphicsText::isParentItem() const
     return m_parentObject && !childItems().isEmpty();
 }
 
-void GraphicsText::announceGeometryChange()
-{
-    if (GraphicsText* parent = parentTextItem())
-        parent->prepareGeometryChange();
-}
-
 void GraphicsText::parentFollows()
 {
-    GraphicsText* parent = parentTextItem();
-    if (!parent)
-        return;
-    parent->m_focusFlag = m_focusFlag;
-    if (parent->textInteractionFlags() != textInteractionFlags())
-        parent->setTextInteractionFlags(textInteractionFlags());
-    QTextDocument& frame = *parent->document();
-    if (frame.defaultTextOption().alignment() != document()->defaultTextOption().alignment())
-        frame.setDefaultTextOption(document()->defaultTextOption());
-    if (frame.textWidth() != textWidth())
-        frame.setTextWidth(textWidth());
-    parent->update();
-}
-
-void GraphicsText::update(const QRectF& rect)
-{
-    QGraphicsTextItem::update(rect);
-    if (QGraphicsItem* parent = parentItem())
-        parent->update();
+    m_surface->parentFollows();
 }
 
 void GraphicsText::placeAt(QPointF position)
@@ -224,31 +162,6 @@ void GraphicsText::resetDocument(TText* record, int cursorPos)
         return;
     m_styleEditor->resetDocument(*record, cursorPos);
     m_styles->refreshUndoBaseline();
-}
-
-int GraphicsText::getBoundingLineStatus() const
-{
-    if (m_focusFlag == FocusObject)
-        return textInteractionFlags() == Qt::NoTextInteraction ? FocusObject : FocusEdit;
-    return m_focusFlag;
-}
-
-int GraphicsText::getStatusId() const
-{
-    const QTextCursor cursor = textCursor();
-    if (cursor.hasSelection())
-        return 1;
-    if (getBoundingLineStatus() == FocusObject)
-        return 0;
-    if (getBoundingLineStatus() == FocusEdit && textInteractionFlags() == Qt::TextEditorInteraction)
-        return 2;
-    return -1;
-}
-
-void GraphicsText::setFocusFlag(int flag)
-{
-    m_focusFlag = flag;
-    update();
 }
 
 bool GraphicsText::isHandleCaret() const
@@ -323,6 +236,12 @@ quint64 GraphicsText::contentVersion() const
     return m_painter->contentVersion();
 }
 
+void GraphicsText::cancelTouch()
+{
+    if (!m_parentObject)
+        m_touchEditor->cancelTouch();
+}
+
 void GraphicsText::initNewTextSelectAll()
 {
     m_touchEditor->initNewTextSelectAll();
@@ -363,111 +282,11 @@ bool GraphicsText::isBlank() const
     return toPlainText().simplified().trimmed().isEmpty();
 }
 
-// ITextSurface: what the units need from the item
-
-void GraphicsText::setWritable(bool writable)
-{
-    setTextInteractionFlags(writable ? Qt::TextEditorInteraction : Qt::NoTextInteraction);
-}
-
-void GraphicsText::handleByTextItem(QEvent::Type type, QEvent& event)
-{
-    switch (type) {
-    case QEvent::GraphicsSceneMousePress:
-        QGraphicsTextItem::mousePressEvent(static_cast<QGraphicsSceneMouseEvent*>(&event));
-        break;
-    case QEvent::GraphicsSceneMouseMove:
-        QGraphicsTextItem::mouseMoveEvent(static_cast<QGraphicsSceneMouseEvent*>(&event));
-        break;
-    case QEvent::GraphicsSceneMouseRelease:
-        QGraphicsTextItem::mouseReleaseEvent(static_cast<QGraphicsSceneMouseEvent*>(&event));
-        break;
-    case QEvent::GraphicsSceneMouseDoubleClick:
-        QGraphicsTextItem::mouseDoubleClickEvent(static_cast<QGraphicsSceneMouseEvent*>(&event));
-        break;
-    case QEvent::KeyPress:
-        QGraphicsTextItem::keyPressEvent(static_cast<QKeyEvent*>(&event));
-        break;
-    default:
-        break;
-    }
-}
-
-void GraphicsText::layoutChanged()
-{
-    parentFollows();
-    m_painter->invalidate();
-    update();
-}
-
-void GraphicsText::repaintBlock(int position)
-{
-    const QTextBlock block = document()->findBlock(position);
-    if (!block.isValid()) {
-        update();
-        return;
-    }
-    const QRectF lines = document()->documentLayout()->blockBoundingRect(block);
-    const double reach = lines.height() / 2.0 + HANDLEPIXMAPHEIGHT;
-    // The frame behind it is painted again with the scene.
-    QGraphicsTextItem::update(QRectF(layoutRect().left(), lines.top(), layoutRect().width(), lines.height())
-                                  .adjusted(-reach, -reach, reach, reach));
-}
-
-void GraphicsText::blockChanged(int position)
-{
-    m_painter->invalidate();
-    repaintBlock(position);
-    m_isBlockRepainted = true;
-}
-
-// At the end of an edit the layout requests a repaint of everything, because it finds nothing left to do: the
-// block was laid out when its formats were applied. That is the request after blockChanged().
-void GraphicsText::repaintLayout(const QRectF& area)
-{
-    const bool isEverything = area.topLeft().isNull() && area.height() > layoutRect().height();
-    if (!std::exchange(m_isBlockRepainted, false) || !isEverything)
-        QGraphicsTextItem::update(area);
-}
-
-void GraphicsText::showShadow(const TShadow& shadow)
-{
-    m_shadowEffect->setOffset(shadow.getShadowDirectionX() * canvasRatio(),
-                              shadow.getShadowDirectionY() * canvasRatio());
-    m_shadowEffect->setBlurRadius(shadow.getShadowBlurRadius());
-    m_shadowEffect->setEnabled(shadow.getShadowDirectionX() != 0 || shadow.getShadowDirectionY() != 0);
-}
-
-// ITextObjectListener: what the units report
-
-void GraphicsText::contentsEdited(TText& before, TText& after, TText& lastBefore, TText& lastAfter)
-{
-    Q_EMIT signalObjectContentsEdited(&before, &after, &lastBefore, &lastAfter);
-}
+// ITextObjectListener: reports that name the object
 
 void GraphicsText::objectMoved(QPointF from, QPointF to)
 {
     Q_EMIT signalObjectPositionChanged(getItemTText()->getTextObjectID(), from, to);
-}
-
-void GraphicsText::styleShown(TText& style)
-{
-    Q_EMIT signalNotifyPropertyAreaObjectSelectionStyleChange(&style);
-}
-
-void GraphicsText::selectionModeChanged(bool shadowAndAlign, bool move)
-{
-    Q_EMIT signalNotifyTextPropertyAreaObjectSelectionMode(shadowAndAlign, move);
-}
-
-void GraphicsText::objectSelected()
-{
-    Q_EMIT signalNotifyIfExistSelectedObject(true);
-}
-
-void GraphicsText::familyReplaced(const QString& family)
-{
-    Q_EMIT signalShowMessageWhenUsingDefaultFont(family);
 }
 
 void GraphicsText::textTyped()
@@ -515,8 +334,11 @@ void GraphicsText::keyboardClosed()
 
 void GraphicsText::slotObjectDocumentChange(int position, int removed, int added)
 {
-    m_painter->invalidate();
-    m_styleEditor->documentChanged(position, removed, added);
+    m_surface->beginChange();
+    const bool isRepainted = m_styleEditor->documentChanged(position, removed, added);
+    if (!isRepainted)
+        m_painter->invalidate();
+    m_surface->endChange(isRepainted);
 }
 
 void GraphicsText::slotObjectPositionChanged()
@@ -576,7 +398,7 @@ void GraphicsText::paint(QPainter* painter, const QStyleOptionGraphicsItem* opti
     // and its glyphs are transparent.
     painter->save();
     if (m_parentObject) {
-        paintFrame(painter);
+        paintFrame(painter, option ? option->exposedRect : boundingRect());
     } else {
         m_touchEditor->paintBelowGlyphs(painter);
         m_painter->drawSelection(painter, textCursor(), hasFocus());
@@ -587,102 +409,15 @@ void GraphicsText::paint(QPainter* painter, const QStyleOptionGraphicsItem* opti
     painter->restore();
 }
 
-void GraphicsText::paintFrame(QPainter* painter)
+void GraphicsText::paintFrame(QPainter* painter, const QRectF& exposed)
 {
     const GraphicsText* child = childTextItem();
     const int status = child ? child->getBoundingLineStatus() : FocusNone;
     if (status == FocusObject || (status == FocusEdit && child->getFocusFlag() == FocusEdit))
-        m_painter->drawItemBoundingRect(painter, child->boundingRect(), status);
+        m_painter->drawItemBoundingRect(painter, child->boundingRect(), status, exposed);
 }
 
 // Events
-
-void GraphicsText::mousePressEvent(QGraphicsSceneMouseEvent* event)
-{
-    if (m_parentObject)
-        handleByTextItem(QEvent::GraphicsSceneMousePress, *event);
-    else
-        m_touchEditor->mousePress(event);
-}
-
-void GraphicsText::mouseMoveEvent(QGraphicsSceneMouseEvent* event)
-{
-    if (m_parentObject)
-        handleByTextItem(QEvent::GraphicsSceneMouseMove, *event);
-    else
-        m_touchEditor->mouseMove(event);
-}
-
-void GraphicsText::mouseReleaseEvent(QGraphicsSceneMouseEvent* event)
-{
-    if (m_parentObject)
-        handleByTextItem(QEvent::GraphicsSceneMouseRelease, *event);
-    else
-        m_touchEditor->mouseRelease(event);
-}
-
-void GraphicsText::cancelTouch()
-{
-    if (!m_parentObject)
-        m_touchEditor->cancelTouch();
-}
-
-void GraphicsText::mouseDoubleClickEvent(QGraphicsSceneMouseEvent* event)
-{
-    if (m_parentObject)
-        handleByTextItem(QEvent::GraphicsSceneMouseDoubleClick, *event);
-    else
-        m_touchEditor->mouseDoubleClick(event);
-}
-
-void GraphicsText::contextMenuEvent(QGraphicsSceneContextMenuEvent* event)
-{
-    if (!event) {
-        LOG_DEBUG_OPERATE(L"Edit Area", 200, L"ContextMenu has no Event ");
-        return;
-    }
-    event->accept();
-}
-
-void GraphicsText::keyPressEvent(QKeyEvent* event)
-{
-    if (m_parentObject) {
-        handleByTextItem(QEvent::KeyPress, *event);
-        return;
-    }
-    // Pasted text takes the style of the place where it is inserted, not the one it was copied with.
-    if (event->matches(QKeySequence::Paste) && textInteractionFlags() == Qt::TextEditorInteraction) {
-        textCursor().insertText(QGuiApplication::clipboard()->text());
-        event->accept();
-        return;
-    }
-    m_touchEditor->keyPress(event);
-}
-
-void GraphicsText::focusOutEvent(QFocusEvent* event)
-{
-    if (!m_parentObject) {
-        LOG_DEBUG_OPERATE(L"Edit Area", 200,
-                          L"focus out focus position " + std::to_wstring(textCursor().position()));
-    }
-    QGraphicsTextItem::focusOutEvent(event);
-}
-
-void GraphicsText::dragEnterEvent(QGraphicsSceneDragDropEvent*)
-{
-}
-
-void GraphicsText::dragLeaveEvent(QGraphicsSceneDragDropEvent*)
-{
-}
-
-void GraphicsText::dragMoveEvent(QGraphicsSceneDragDropEvent*)
-{
-}
-
-void GraphicsText::dropEvent(QGraphicsSceneDragDropEvent*)
-{
-}
 
 void GraphicsText::customEvent(QEvent* event)
 {
@@ -699,18 +434,9 @@ void GraphicsText::customEvent(QEvent* event)
     }
 }
 
-bool GraphicsText::eventFilter(QObject* watched, QEvent* event)
-{
-    if (watched != this && watched->parent() == this && isBlinkOfCaret(watched, event))
-        return true;
-    if (watched == this && !m_parentObject && m_touchEditor->filter(event))
-        return true;
-    return QGraphicsTextItem::eventFilter(watched, event);
-}
-
 QVariant GraphicsText::itemChange(GraphicsItemChange change, const QVariant& value)
 {
     if (change == ItemSelectedHasChanged && !m_parentObject)
         Q_EMIT signalObjectSelectedHasChanged(this);
-    return QGraphicsTextItem::itemChange(change, value);
+    return ReportingTextItem::itemChange(change, value);
 }

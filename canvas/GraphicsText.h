@@ -1,21 +1,16 @@
 #pragma once
 
-#include "canvas/ITextObjectListener.h"
-#include "canvas/ITextSurface.h"
-#include "canvas/TextObjectConstants.h"
+#include "canvas/ReportingTextItem.h"
 #include "canvas/TextPlacement.h"
 #include "messaging/services/SystemSetupDef.h"
-#include "touchui/CanvasTextField.h"
 
-#include <QGraphicsTextItem>
 #include <QPointF>
 #include <QRectF>
-#include <QTextCursor>
 #include <memory>
 
 class QGraphicsDropShadowEffect;
-class QKeyEvent;
 class StyleDocument;
+class TextItemSurface;
 class TextPainter;
 class TextStyle;
 class TextStyleEditor;
@@ -30,15 +25,17 @@ class TText;
 // basic plane takes two positions: the first style holds the whole character, the second an empty string. The
 // Qt document does layout only; glyphs, outlines and caret are painted here.
 //
+// The object makes its units and is what others call; the units do the work: TextStyleEditor keeps document
+// and record synchronised, TouchTextEditor handles finger and keys, TextPainter paints, TextItemSurface is
+// the item as they see it.
+//
 // Coordinates: item coordinates are pixels of the raster that the object is laid out for; positions in
 // records are scene coordinates of the 1280 canvas, font sizes and outline widths are pixels of the 1920
 // raster. GUI thread only.
-class GraphicsText : public QGraphicsTextItem, private ITextSurface, private ITextObjectListener
+class GraphicsText : public ReportingTextItem
 {
     Q_OBJECT
 public:
-    enum { Type = CanvasTextField::ITEM_TYPE };
-
     // Makes a child that shows a copy of the record (null: a default record without characters). An id that
     // is not 0 becomes the id of the copy.
     GraphicsText(TText* record, int id, QGraphicsItem* parent = nullptr, QGraphicsScene* scene = nullptr);
@@ -70,13 +67,9 @@ public:
     // is.
     void resetDocument(TText* record, int cursorPos);
 
-    // Returns 0 when selected as an object, 1 with a selection, 2 with a caret and no selection, -1 when not
-    // active.
-    int getStatusId() const;
-    int getBoundingLineStatus() const;
-    int getFocusFlag() const override { return m_focusFlag; }
-    void setFocusFlag(int flag) override;
+    // Returns whether handles are shown for a selection.
     bool isHandleCaret() const;
+    // Returns whether the keyboard is sent the description for a double tap.
     bool isDoubleClickedSelection() const;
 
     // Change the style. source holds one style per changed character, property ids are those of StyleProperty
@@ -116,19 +109,16 @@ public:
     // Returns whether the text is empty or consists of white space only.
     bool isBlank() const;
 
-    int type() const override { return Type; }
     QRectF boundingRect() const override;
     void paint(QPainter* painter, const QStyleOptionGraphicsItem* option, QWidget* widget) override;
-    // Repaints the frame together with the item.
-    void update(const QRectF& rect = QRectF());
 
     // Returns a number that changes whenever what is drawn may have changed.
     quint64 contentVersion() const;
-    double canvasRatio() const override;
+    // Returns the raster pixels per stored pixel.
+    double canvasRatio() const;
     QGraphicsDropShadowEffect* shadowEffect() const { return m_shadowEffect; }
-    // Returns the rectangle of the layout, which does not depend on the bounding rect flag.
-    QRectF layoutRect() const { return QGraphicsTextItem::boundingRect(); }
-    void parentFollows() override;
+    // Copies focus, interaction and layout width to the parent and repaints it.
+    void parentFollows();
 
 public Q_SLOTS:
     void slotObjectDocumentChange(int position, int removed, int added);
@@ -137,69 +127,13 @@ public Q_SLOTS:
     void slotLongPressed();
     void slotObjectDisplayInputLanguage(SystemSetupDef::emInputLanguageType language);
 
-Q_SIGNALS:
-    // Reports old and new record, old and new last style. They are valid during the call only.
-    void signalObjectContentsEdited(TText* oldText, TText* newText, TText* oldLast, TText* newLast);
-    // Reports the style at the cursor or of the selection. It is valid during the call only.
-    void signalNotifyPropertyAreaObjectSelectionStyleChange(TText* style);
-    // Reports whether shadow and align, and whether the move buttons are available.
-    void signalNotifyTextPropertyAreaObjectSelectionMode(bool shadowAndAlign, bool move);
-    // Reports a family that is not installed.
-    void signalShowMessageWhenUsingDefaultFont(QString family);
-    void signalObjectPositionChanged(int id, QPointF from, QPointF to);
-    // Opens the keyboard for the item, or closes it when null.
-    void signalNotifySceneCurrentObjectInEditMode(GraphicsText* item);
-    void signalNotifySceneCurrentMousePressedObjectId(int id);
-    void signalNotifyIfExistSelectedObject(bool exists);
-    void signalSoftWareClosedWhenEditObject();
-    void signalSaveArchive(GraphicsText* item);
-    void signalDeleteItem();
-    void signalObjectSelectedHasChanged(QGraphicsItem* item);
-    void signalObjectHasLostFocus(GraphicsText* item);
-    void signalGetSceneInputLanguage(GraphicsText* item);
-    // Emitted before the selection or the text is changed from outside: previews have to end first.
-    void signalEndPreview();
-
 protected:
-    void mousePressEvent(QGraphicsSceneMouseEvent* event) override;
-    void mouseMoveEvent(QGraphicsSceneMouseEvent* event) override;
-    void mouseReleaseEvent(QGraphicsSceneMouseEvent* event) override;
-    void mouseDoubleClickEvent(QGraphicsSceneMouseEvent* event) override;
-    void contextMenuEvent(QGraphicsSceneContextMenuEvent* event) override;
-    void keyPressEvent(QKeyEvent* event) override;
-    void focusOutEvent(QFocusEvent* event) override;
-    void dragEnterEvent(QGraphicsSceneDragDropEvent* event) override;
-    void dragLeaveEvent(QGraphicsSceneDragDropEvent* event) override;
-    void dragMoveEvent(QGraphicsSceneDragDropEvent* event) override;
-    void dropEvent(QGraphicsSceneDragDropEvent* event) override;
     void customEvent(QEvent* event) override;
-    bool eventFilter(QObject* watched, QEvent* event) override;
     QVariant itemChange(GraphicsItemChange change, const QVariant& value) override;
 
 private:
-    // ITextSurface
-    QTextCursor selection() const override { return textCursor(); }
-    void select(const QTextCursor& cursor) override { setTextCursor(cursor); }
-    bool isWritable() const override { return textInteractionFlags() == Qt::TextEditorInteraction; }
-    void setWritable(bool writable) override;
-    void takeFocus() override { setFocus(); }
-    void giveUpFocus() override { clearFocus(); }
-    void handleByTextItem(QEvent::Type type, QEvent& event) override;
-    void announceGeometryChange() override;
-    void layoutChanged() override;
-    void repaint() override { update(); }
-    void repaintBlock(int position) override;
-    void blockChanged(int position) override;
-    void repaintLayout(const QRectF& area);
-    void showShadow(const TShadow& shadow) override;
-
     // ITextObjectListener
-    void contentsEdited(TText& before, TText& after, TText& lastBefore, TText& lastAfter) override;
     void objectMoved(QPointF from, QPointF to) override;
-    void styleShown(TText& style) override;
-    void selectionModeChanged(bool shadowAndAlign, bool move) override;
-    void objectSelected() override;
-    void familyReplaced(const QString& family) override;
     void textTyped() override;
     void objectPressed() override;
     void editingBegins() override;
@@ -210,17 +144,16 @@ private:
     // Called when the operator closed the keyboard.
     void keyboardClosed();
     QRectF limitedBoundingRect() const;
-    void paintFrame(QPainter* painter);
+    void paintFrame(QPainter* painter, const QRectF& exposed);
 
     std::unique_ptr<StyleDocument> m_styles;
     std::unique_ptr<TextPainter> m_painter;
     TextPlacement m_placement;
+    std::unique_ptr<TextItemSurface> m_surface;
     std::unique_ptr<TextStyleEditor> m_styleEditor;
     std::unique_ptr<TouchTextEditor> m_touchEditor;
     // Owned by the item, see setGraphicsEffect().
     QGraphicsDropShadowEffect* m_shadowEffect = nullptr;
-    int m_focusFlag = TextObjectConstants::FocusNone;
-    bool m_isBlockRepainted = false; // until the layout requests to repaint everything
     bool m_parentObject = false;
     bool m_bigScene = false;
     bool m_boundingRectFlag = false;

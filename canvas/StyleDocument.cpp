@@ -47,6 +47,16 @@ void copyObjectProperties(TText& out, const TText& from)
     out.setText(std::string());
 }
 
+// Returns whether the text is one character that is stored as it is.
+bool isOneUnit(const QString& text)
+{
+    if (text.size() != 1)
+        return false;
+    const QChar c = text.at(0);
+    return !c.isSurrogate() && !c.isNull() && c != QLatin1Char('\r') && c != QChar::ParagraphSeparator &&
+           c != QChar::LineSeparator && c != QChar::ReplacementCharacter;
+}
+
 bool isCombining(QChar c)
 {
     return c.isMark() || c.isLowSurrogate() || c == QChar(0x200D) ||
@@ -92,12 +102,30 @@ QString StyleDocument::storedText(const QString& characters, qsizetype index)
     return c.isSurrogate() ? QString(QChar(QChar::ReplacementCharacter)) : QString(c);
 }
 
+// Returns whether each run has one character of one unit, which is usual, and there are not too many.
+bool StyleDocument::isNormal(const TText& record)
+{
+    int characters = 0;
+    for (const TextStyle* style : record.textItems()) {
+        if (!style)
+            return false;
+        const std::string& stored = style->getText();
+        const bool isAscii = stored.size() == 1 && stored.front() > 0 && stored.front() != '\r';
+        if (!isAscii && !isOneUnit(textOf(*style)))
+            return false;
+        characters += stored == "\n" ? 0 : 1;
+    }
+    return characters <= CHARACTER_LIMIT;
+}
+
 void StyleDocument::normalise(TText& record)
 {
     record.setXValue(usablePlace(record.getXValue()));
     record.setYValue(usablePlace(record.getYValue()));
     record.setZValue(usablePlace(record.getZValue()));
 
+    if (isNormal(record))
+        return;
     const std::vector<TextStyle*> source = record.getTextItems();
     std::vector<TextStyle*> result;
     result.reserve(source.size());
@@ -284,11 +312,18 @@ void StyleDocument::synchronise(TText& target, const TText& source)
         std::vector<TextStyle*> items;
         items.reserve(from.size());
         items.insert(items.end(), to.begin(), to.begin() + std::ptrdiff_t(head));
-        for (size_t i = head; i < from.size() - tail; ++i)
-            items.push_back(new TextStyle(*from[i]));
+        size_t old = head; // of the styles that are overwritten or deleted
+        for (size_t i = head; i < from.size() - tail; ++i) {
+            if (old == to.size() - tail) {
+                items.push_back(new TextStyle(*from[i]));
+                continue;
+            }
+            *to[old] = *from[i];
+            items.push_back(to[old++]);
+        }
         items.insert(items.end(), to.end() - std::ptrdiff_t(tail), to.end());
-        for (size_t i = head; i < to.size() - tail; ++i)
-            delete to[i];
+        for (; old < to.size() - tail; ++old)
+            delete to[old];
         target.setTextItems(std::move(items));
     }
     const int id = source.getTextObjectID();

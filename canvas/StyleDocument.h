@@ -90,6 +90,8 @@ public:
     static void normalise(TText& record);
 
 private:
+    static bool isNormal(const TText& record);
+
     TText m_current;
     TText m_lastAlpha;
     TText m_nextInsert;

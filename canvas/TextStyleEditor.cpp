@@ -61,11 +61,21 @@ void TextStyleEditor::ensureFamily(TextStyle& style)
     m_listener.familyReplaced(wanted);
 }
 
+void TextStyleEditor::ensureFamilies(int begin, int end)
+{
+    const TextStyle* previous = nullptr;
+    for (int i = begin; i < end; ++i) {
+        TextStyle* style = m_styles.at(i);
+        if (!previous || previous->getFontFamily() != style->getFontFamily())
+            ensureFamily(*style);
+        previous = style;
+    }
+}
+
 void TextStyleEditor::initShowText()
 {
     const Guard guard(*this);
-    for (TextStyle* style : m_styles.current().textItems())
-        ensureFamily(*style);
+    ensureFamilies(0, m_styles.count());
     m_layout.insertRecord();
     if (m_styles.isEmpty() && !m_styles.lastAlpha().textItems().empty())
         m_layout.setCaretHeight(*m_styles.lastAlpha().textItems().front());
@@ -90,17 +100,17 @@ void TextStyleEditor::resetDocument(const TText& record, int cursorPosition)
 
 // Typing
 
-void TextStyleEditor::documentChanged(int position, int removed, int added)
+bool TextStyleEditor::documentChanged(int position, int removed, int added)
 {
     if (m_guard > 0 || (removed == 0 && added == 0))
-        return;
+        return false;
     // The document includes its last paragraph break in the count when it is filled for the first time.
     removed = std::clamp(removed, 0, std::max(m_styles.count() - position, 0));
     added = std::max(documentLength(m_document) - (m_styles.count() - removed), 0);
     added = cutOffCharsBeyondMaxNum(position, added);
     trimUnchanged(position, removed, added);
     if (removed == 0 && added == 0)
-        return;
+        return false;
 
     m_listener.textTyped();
     m_undoFlag = 1;
@@ -117,11 +127,12 @@ void TextStyleEditor::documentChanged(int position, int removed, int added)
     reconcile();
     if (previewTakenBack) {
         const Guard guard(*this);
-        m_layout.applyFormats(0, m_styles.count());
+        m_layout.applyStyles(0, m_styles.count());
         m_layout.updateWidthAndAlign();
     }
     showCurrentTextStyle();
     m_listener.textTyped();
+    return true;
 }
 
 void TextStyleEditor::repairTexts(int begin, int end)
@@ -245,7 +256,7 @@ void TextStyleEditor::charsAddedChange(int position, int added)
     m_layout.applyFormats(position, position + int(text.size()));
     if (!m_styles.isEmpty())
         m_layout.setCaretHeight(*m_styles.at(0));
-    m_layout.updateAfterTyping(position);
+    m_layout.updateAfterTyping(position, int(text.size()));
     applyShadow();
     m_styles.forgetNextInsert();
 }
@@ -264,7 +275,7 @@ void TextStyleEditor::charsRemovedChange(int position, int count)
         m_layout.setCaretHeight(*m_styles.lastAlpha().textItems().front());
     repairTexts(position - 1, position + 1);
     m_layout.finishLayout();
-    m_layout.updateWidthAndAlign();
+    m_layout.updateAfterTyping(position, 0);
     applyShadow();
 }
 
@@ -380,7 +391,7 @@ void TextStyleEditor::cancelPreview()
     if (!m_styles.takeBackPreview())
         return;
     const Guard guard(*this);
-    m_layout.applyFormats(0, m_styles.count());
+    m_layout.applyStyles(0, m_styles.count());
     m_layout.updateWidthAndAlign();
     applyShadow();
     m_undoFlag = CommittedChange;
@@ -396,11 +407,10 @@ void TextStyleEditor::changeSelectionProperty(int id, const TText& source, int f
     const auto& given = source.textItems();
     const int begin = std::min(from, to);
     const int end = std::min({std::max(from, to), begin + int(given.size()), m_styles.count()});
-    for (int i = begin; i < end; ++i) {
+    for (int i = begin; i < end; ++i)
         StyleDocument::setCharacterProperty(id, *m_styles.at(i), *given[size_t(i - begin)]);
-        ensureFamily(*m_styles.at(i));
-    }
-    m_layout.applyFormats(begin, end);
+    ensureFamilies(begin, end);
+    m_layout.applyStyles(begin, end);
     m_layout.updateWidthAndAlign();
 }
 

@@ -19,8 +19,9 @@ public:
     void initShowText();
     void resetDocument(const TText& record, int cursorPosition);
 
-    // Call when the document reports a change; changes made by this class are ignored.
-    void documentChanged(int position, int removed, int added);
+    // Call when the document reports a change; changes made by this class are ignored. Returns whether the
+    // surface was informed of what has to be drawn anew.
+    bool documentChanged(int position, int removed, int added);
 
     void changeAllStyleWhenSelectionMode(const TText& source, int id, bool overall, int undoFlag);
     void changeAllStyleWhenHasSelection(const TText& source, int id);
@@ -54,8 +55,9 @@ public:
 private:
     class Guard;
 
-    // Replaces a missing family and reports it.
+    // Replace missing families and report them, for one style or those from begin to before end.
     void ensureFamily(TextStyle& style);
+    void ensureFamilies(int begin, int end);
     int cutOffCharsBeyondMaxNum(int position, int added);
     // Narrows a reported change down to the characters that did change.
     void trimUnchanged(int& position, int& removed, int& added) const;

@@ -7,14 +7,18 @@
 #include "canvas/TextObjectConstants.h"
 #include "canvas/TextPlacement.h"
 #include "canvas/TextStyleEditor.h"
+#include "support/LogManager.h"
 
+#include <QClipboard>
 #include <QGraphicsSceneMouseEvent>
+#include <QGuiApplication>
 #include <QKeyEvent>
 #include <QTextBlock>
 #include <QTextCursor>
 #include <QTextDocument>
 #include <QTextLayout>
 #include <algorithm>
+#include <string>
 #include <utility>
 
 using namespace TextObjectConstants;
@@ -542,6 +546,12 @@ void TouchTextEditor::longPressed()
 
 void TouchTextEditor::keyPress(QKeyEvent* event)
 {
+    // Pasted text takes the style of the place where it is inserted, not the one it was copied with.
+    if (event->matches(QKeySequence::Paste) && m_surface.isWritable()) {
+        m_surface.selection().insertText(QGuiApplication::clipboard()->text());
+        event->accept();
+        return;
+    }
     m_state.doubleClickedSelection = false;
     const QTextCursor before = m_surface.selection();
     m_surface.handleByTextItem(QEvent::KeyPress, *event);
@@ -559,15 +569,21 @@ void TouchTextEditor::keyPress(QKeyEvent* event)
     repaintBetween(before, m_surface.selection());
 }
 
-// Repaints what a key changed in the paragraphs of the old and the new caret.
+void TouchTextEditor::focusLost()
+{
+    LOG_DEBUG_OPERATE(L"Edit Area", 200,
+                      L"focus out focus position " + std::to_wstring(m_surface.selection().position()));
+}
+
+// Repaints the old and the new caret. The text that a key changed is repainted with its paragraph.
 void TouchTextEditor::repaintBetween(const QTextCursor& before, const QTextCursor& after)
 {
     if (before.hasSelection() || after.hasSelection() || m_state.handleCaret) {
         m_surface.repaint();
         return;
     }
-    m_surface.repaintBlock(before.position());
-    m_surface.repaintBlock(after.position());
+    m_surface.repaintCaret(before.position());
+    m_surface.repaintCaret(after.position());
 }
 
 void TouchTextEditor::setCursorPosition(int position)

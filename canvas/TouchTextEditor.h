@@ -1,14 +1,12 @@
 #pragma once
 
 #include "canvas/CaretPainter.h"
+#include "canvas/ITextInput.h"
 #include "canvas/TextObjectParts.h"
 #include "canvas/TouchState.h"
 
 #include <QTimer>
 
-class QEvent;
-class QGraphicsSceneMouseEvent;
-class QKeyEvent;
 class QPainter;
 class QTextCursor;
 class TextStyleEditor;
@@ -16,7 +14,7 @@ class TextStyleEditor;
 // Handles the finger and the soft keyboard for a text object: the first tap selects the object, a second one
 // starts editing, a drag moves it within limits, handles and long press select characters. The state of the
 // finger is one TouchState::Gesture, which press, move and release change in turn. GUI thread only.
-class TouchTextEditor
+class TouchTextEditor : public ITextInput
 {
 public:
     // The style editor belongs to the same object.
@@ -26,18 +24,18 @@ public:
     bool isDoubleClickedSelection() const { return m_state.doubleClickedSelection; }
     void clearHandleCaret() { m_state.handleCaret = false; }
 
-    void mousePress(QGraphicsSceneMouseEvent* event);
-    void mouseMove(QGraphicsSceneMouseEvent* event);
-    void mouseRelease(QGraphicsSceneMouseEvent* event);
-    void mouseDoubleClick(QGraphicsSceneMouseEvent* event);
+    bool filter(QEvent* event) override;
+    void mousePress(QGraphicsSceneMouseEvent* event) override;
+    void mouseMove(QGraphicsSceneMouseEvent* event) override;
+    void mouseRelease(QGraphicsSceneMouseEvent* event) override;
+    void mouseDoubleClick(QGraphicsSceneMouseEvent* event) override;
+    void keyPress(QKeyEvent* event) override;
+    void focusLost() override;
     // Ends the current press without a release.
     void cancelTouch();
-    void keyPress(QKeyEvent* event);
     // Returns the timer of the long press. Connect its timeout to longPressed().
     const QTimer& longPressTimer() const { return m_longPressTimer; }
     void longPressed();
-    // Returns whether the event is handled and has to be swallowed.
-    bool filter(QEvent* event);
 
     void getSelectionInfo(int begin, int end, int current, int mode);
     void initNewTextSelectAll();

@@ -25,7 +25,7 @@ TText::TText(const TText& other)
     , m_shadowStyle(other.m_shadowStyle)
     , m_textShadow(other.m_textShadow)
 {
-    cloneTextItems(other.m_textItems);
+    assignTextItems(other.m_textItems);
 }
 
 TText& TText::operator=(const TText& other)
@@ -40,8 +40,7 @@ TText& TText::operator=(const TText& other)
     m_textAlign = other.m_textAlign;
     m_shadowStyle = other.m_shadowStyle;
     m_textShadow = other.m_textShadow;
-    releaseVectorTextStyle();
-    cloneTextItems(other.m_textItems);
+    assignTextItems(other.m_textItems);
     return *this;
 }
 
@@ -50,12 +49,25 @@ TText::~TText()
     releaseVectorTextStyle();
 }
 
-void TText::cloneTextItems(const std::vector<TextStyle*>& items)
+// Overwrites the runs that are there already, which is cheaper than new ones.
+void TText::assignTextItems(const std::vector<TextStyle*>& items)
 {
     m_textItems.reserve(items.size());
-    for (const TextStyle* item : items)
-        if (item)
+    size_t count = 0;
+    for (const TextStyle* item : items) {
+        if (!item)
+            continue;
+        if (count == m_textItems.size())
             m_textItems.push_back(new TextStyle(*item));
+        else if (m_textItems[count])
+            *m_textItems[count] = *item;
+        else
+            m_textItems[count] = new TextStyle(*item);
+        ++count;
+    }
+    for (size_t i = count; i < m_textItems.size(); ++i)
+        delete m_textItems[i];
+    m_textItems.resize(count);
 }
 
 void TText::releaseVectorTextStyle()

@@ -67,7 +67,7 @@ public:
     bool operator==(const TText& other) const;
 
 private:
-    void cloneTextItems(const std::vector<TextStyle*>& items);
+    void assignTextItems(const std::vector<TextStyle*>& items);
 
     int m_textObjectID;
     std::string m_text;

@@ -43,6 +43,14 @@ bool serviceOwnsState()
     return applicationName() == QLatin1String("Titler");
 }
 
+// Returns the description of the field, null for none, and keeps its pattern.
+tagSoftKeyBoardInitData sendDataOf(const InputField* field)
+{
+    const tagSoftKeyBoardInitData data = field == nullptr ? tagSoftKeyBoardInitData() : field->describe();
+    KSInputContext::m_strLimitCondition = QString::fromStdWString(data.limitCondition);
+    return data;
+}
+
 } // namespace
 
 void KSInputContext::install()
@@ -197,13 +205,6 @@ tagSoftKeyBoardInitData KSInputContext::getSendData()
 tagSoftKeyBoardInitData KSInputContext::getSendData(QLineEdit* edit)
 {
     return sendDataOf(InputField::of(edit).get());
-}
-
-tagSoftKeyBoardInitData KSInputContext::sendDataOf(const InputField* field)
-{
-    const tagSoftKeyBoardInitData data = field == nullptr ? tagSoftKeyBoardInitData() : field->describe();
-    m_strLimitCondition = QString::fromStdWString(data.limitCondition);
-    return data;
 }
 
 // --- Keyboard window ----------------------------------------------------------------------------------

@@ -3,6 +3,7 @@
 #include "tests/support/Patience.h"
 
 #include <QAbstractEventDispatcher>
+#include <QFontDatabase>
 #include <QPaintEvent>
 #include <QRegion>
 #include <QScreen>
@@ -65,12 +66,21 @@ private Q_SLOTS:
     void keptPictureFollowsTheText();
     void keysPaintWhatChanges_data();
     void keysPaintWhatChanges();
+    void somethingBetweenTwoKeys_data();
+    void somethingBetweenTwoKeys();
+    void fontsRemovedBetweenTwoKeys();
     void aKeyPaintsItsParagraph();
+    void anErasedCharacterPaintsItsParagraph();
 
 private:
     // Returns what is on the screen, without painting anything.
     QImage onScreen() const { return m_canvas->view.screen()->grabWindow(m_canvas->view.winId()).toImage(); }
-    void openLines(const QStringList& lines, int align, bool outlined);
+    void openLines(const QStringList& lines, int align, bool outlined, const char* family = "KST");
+    void editLines(const QStringList& lines);
+    // Returns whether the screen shows what it shows when everything is painted anew.
+    bool isPaintedWhole();
+    // Returns the height of what the key paints.
+    int heightPaintedBy(Qt::Key key);
     void bring(const QString& state);
     // Paints everything that is due.
     void settle();
@@ -272,9 +282,10 @@ void tst_canvasscene_repaint::keptPictureFollowsTheText()
     QCOMPARE(grab(), last);
 }
 
-void tst_canvasscene_repaint::openLines(const QStringList& lines, int align, bool outlined)
+void tst_canvasscene_repaint::openLines(const QStringList& lines, int align, bool outlined,
+                                        const char* family)
 {
-    TText record = makeRecord(lines.join(QLatin1Char('\n')), 1, "KST", 60);
+    TText record = makeRecord(lines.join(QLatin1Char('\n')), 1, family, 60);
     record.setTextAlign(align);
     TEdge edge;
     edge.setEdgeWidth(12);
@@ -284,6 +295,15 @@ void tst_canvasscene_repaint::openLines(const QStringList& lines, int align, boo
         style->setTextEdge(edge);
     }
     m_canvas->open({record});
+}
+
+bool tst_canvasscene_repaint::isPaintedWhole()
+{
+    settle();
+    const QImage shown = onScreen();
+    m_canvas->view.viewport()->update();
+    settle();
+    return shown == onScreen();
 }
 
 void tst_canvasscene_repaint::keysPaintWhatChanges_data()
@@ -313,30 +333,142 @@ void tst_canvasscene_repaint::keysPaintWhatChanges()
     int number = 0;
     for (const Qt::Key key : keys) {
         QTest::keyClick(m_canvas->view.viewport(), key);
-        settle();
-        const QImage shown = onScreen();
-        m_canvas->view.viewport()->update();
-        settle();
-        QVERIFY2(shown == onScreen(), qPrintable(QString("key %1: %2").arg(number).arg(key)));
+        QVERIFY2(isPaintedWhole(), qPrintable(QString("key %1: %2").arg(number).arg(key)));
         ++number;
     }
 }
 
-void tst_canvasscene_repaint::aKeyPaintsItsParagraph()
+void tst_canvasscene_repaint::somethingBetweenTwoKeys_data()
 {
-    openLines({QStringLiteral("the longest line"), QStringLiteral("a"), QStringLiteral("b"),
-               QStringLiteral("c"), QStringLiteral("d"), QStringLiteral("e"), QStringLiteral("f")},
-              2, false);
+    QTest::addColumn<std::function<void(Canvas&)>>("action");
+    using Action = std::function<void(Canvas&)>;
+    const auto preview = [](Canvas& c, int property, const std::function<void(TextStyle&)>& set) {
+        c.text(1)->getSelectionInfo(5, 9, 9, 1);
+        TextStyle style = makeStyle("");
+        set(style);
+        TText source = makeSource(style, 4);
+        c.scene->slotChangeObjectTextStyle(&source, property, 0);
+    };
+    const Action color = [preview](Canvas& c) {
+        preview(c, TextObjectConstants::PropertyColor, [](TextStyle& s) { s.setFontColor("#00AA00"); });
+    };
+    const Action size = [preview](Canvas& c) {
+        preview(c, TextObjectConstants::PropertySize, [](TextStyle& s) { s.setFontSize(90); });
+    };
+    const auto caretAt = [](Canvas& c, int position) {
+        KSSoftKeyboardCursorSettingEvent event(0, 0, position, 0);
+        QCoreApplication::sendEvent(c.text(1), &event);
+    };
+    QTest::newRow("a colour shown by the palette") << color;
+    QTest::newRow("a size shown by the palette") << size;
+    QTest::newRow("a colour shown, another caret") << Action([color, caretAt](Canvas& c) {
+        color(c);
+        caretAt(c, 2);
+    });
+    QTest::newRow("a size shown, another caret") << Action([size, caretAt](Canvas& c) {
+        size(c);
+        caretAt(c, 2);
+    });
+    // What a lock does to a finger that is on the canvas.
+    QTest::newRow("a touch that is broken off") << Action([](Canvas& c) {
+        const QPointF line = c.text(1)->mapToScene(c.text(1)->layoutRect().center());
+        QTest::mousePress(c.view.viewport(), Qt::LeftButton, {}, c.view.mapFromScene(line));
+        c.view.cancelTouch();
+    });
+    QTest::newRow("a touch broken off while handles show") << Action([](Canvas& c) {
+        c.text(1)->getSelectionInfo(5, 9, 9, 1);
+        const QPointF line = c.text(1)->mapToScene(c.text(1)->layoutRect().center());
+        QTest::mousePress(c.view.viewport(), Qt::LeftButton, {}, c.view.mapFromScene(line));
+        c.sendMove(c.view.mapFromScene(line + QPointF(30.0, 0.0)));
+        c.view.cancelTouch();
+    });
+}
+
+// Whether it was painted before the second key or not.
+void tst_canvasscene_repaint::somethingBetweenTwoKeys()
+{
+    QFETCH(std::function<void(Canvas&)>, action);
+    for (const bool isPainted : {true, false}) {
+        editLines({QStringLiteral("top"), QStringLiteral("the longest line"), QStringLiteral("a j")});
+        QTest::keyClick(m_canvas->view.viewport(), Qt::Key_A);
+        settle();
+        action(*m_canvas);
+        if (isPainted)
+            settle();
+        QTest::keyClick(m_canvas->view.viewport(), Qt::Key_Q);
+        QVERIFY(isPaintedWhole());
+        QTest::keyClick(m_canvas->view.viewport(), Qt::Key_W);
+        QVERIFY(isPaintedWhole());
+        const QImage shown = onScreen();
+        m_canvas->text(1)->setRadio(m_canvas->text(1)->canvasRatio(), false); // forgets what is kept
+        m_canvas->view.viewport()->update();
+        settle();
+        QVERIFY(shown == onScreen());
+    }
+}
+
+// The paragraphs of which the key changed nothing are drawn with the fonts that there are now.
+void tst_canvasscene_repaint::fontsRemovedBetweenTwoKeys()
+{
+    const int font = QFontDatabase::addApplicationFont("/usr/share/fonts/truetype/dejavu/DejaVuSansMono.ttf");
+    QVERIFY(font >= 0);
+    openLines({QStringLiteral("the longest line"), QStringLiteral("gas"), QStringLiteral("a j")}, -1, true,
+              "DejaVu Sans Mono");
     GraphicsText* text = m_canvas->text(1);
     text->initNewTextSelectAll();
     QTRY_VERIFY(text->hasFocus());
     QTest::keyClick(m_canvas->view.viewport(), Qt::Key_End);
-    QTest::keyClick(m_canvas->view.viewport(), Qt::Key_E); // the first one also sets the font of the caret
+    QTest::keyClick(m_canvas->view.viewport(), Qt::Key_A);
+    settle();
+    const QImage before = onScreen();
+    QVERIFY(QFontDatabase::removeApplicationFont(font));
+    QTest::keyClick(m_canvas->view.viewport(), Qt::Key_Backspace);
+    QVERIFY(isPaintedWhole());
+    const QImage after = onScreen();
+    text->setRadio(text->canvasRatio(), false); // forgets what is kept
+    m_canvas->view.viewport()->update();
+    settle();
+    QVERIFY(after == onScreen());
+    const QRect first =
+        m_canvas->view.mapFromScene(text->mapRectToScene(QRectF(0.0, 0.0, text->layoutRect().width(), 70.0)))
+            .boundingRect();
+    QVERIFY(before.copy(first) != after.copy(first));
+}
+
+void tst_canvasscene_repaint::editLines(const QStringList& lines)
+{
+    openLines(lines, -1, false);
+    GraphicsText* text = m_canvas->text(1);
+    text->initNewTextSelectAll();
+    QTRY_VERIFY(text->hasFocus());
+    QTest::keyClick(m_canvas->view.viewport(), Qt::Key_End);
+}
+
+int tst_canvasscene_repaint::heightPaintedBy(Qt::Key key)
+{
     settle();
     m_counter.region = QRegion();
-    QCOMPARE(paintsOf([&] { QTest::keyClick(m_canvas->view.viewport(), Qt::Key_E); }), 1);
-    const int painted = m_counter.region.boundingRect().height();
-    const double whole = text->layoutRect().height();
+    const int paints = paintsOf([&] { QTest::keyClick(m_canvas->view.viewport(), key); });
+    return paints == 1 ? m_counter.region.boundingRect().height() : -1;
+}
+
+void tst_canvasscene_repaint::aKeyPaintsItsParagraph()
+{
+    editLines({QStringLiteral("the longest line"), QStringLiteral("a"), QStringLiteral("b"),
+               QStringLiteral("c"), QStringLiteral("d"), QStringLiteral("e"), QStringLiteral("f")});
+    QTest::keyClick(m_canvas->view.viewport(), Qt::Key_E); // the first one also sets the font of the caret
+    const int painted = heightPaintedBy(Qt::Key_E);
+    const double whole = m_canvas->text(1)->layoutRect().height();
+    QVERIFY2(painted > 0 && painted < whole / 2, qPrintable(QString("%1 of %2").arg(painted).arg(whole)));
+}
+
+void tst_canvasscene_repaint::anErasedCharacterPaintsItsParagraph()
+{
+    editLines({QStringLiteral("the longest line"), QStringLiteral("a"), QStringLiteral("b"),
+               QStringLiteral("c"), QStringLiteral("d"), QStringLiteral("e"), QStringLiteral("f")});
+    QTest::keyClick(m_canvas->view.viewport(), Qt::Key_E);
+    const int painted = heightPaintedBy(Qt::Key_Backspace);
+    const double whole = m_canvas->text(1)->layoutRect().height();
     QVERIFY2(painted > 0 && painted < whole / 2, qPrintable(QString("%1 of %2").arg(painted).arg(whole)));
 }
 
