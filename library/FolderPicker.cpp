@@ -192,8 +192,9 @@ void FolderPicker::connectTree()
     connect(m_tree, &QAbstractItemView::pressed, this, &FolderPicker::pressedFolder);
     connect(m_tree, &QTreeView::collapsed, this, &FolderPicker::pressedFolder);
     connect(m_tree, &QTreeView::expanded, this, &FolderPicker::pressedFolder);
-    connect(m_tree, &KSTreeView::signalCurrentChangedByTouch, this, &FolderPicker::slotCurrentChangedByTouch);
-    connect(m_tree, &KSTreeView::signalPressedAndHold, this, &FolderPicker::startEditing);
+    connect(m_tree->touch(), &TreeTouch::currentChangedByTouch, this,
+            &FolderPicker::slotCurrentChangedByTouch);
+    connect(m_tree->touch(), &TreeTouch::pressedAndHeld, this, &FolderPicker::startEditing);
     connect(m_tree->header(), &QHeaderView::sectionClicked, this, &FolderPicker::slotHeaderClicked);
     connect(m_edit.get(), &FolderNameEdit::folderMoved, this, &FolderPicker::folderMoved);
     connect(m_edit.get(), &FolderNameEdit::rowAdded, this, [this] { m_preview->clearThumbnailArea(); });

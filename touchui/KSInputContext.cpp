@@ -43,6 +43,15 @@ bool serviceOwnsState()
     return applicationName() == QLatin1String("Titler");
 }
 
+// Describes the field of a widget, and keeps the pattern of its validator.
+tagSoftKeyBoardInitData describe(QWidget* widget)
+{
+    const auto field = InputField::of(widget);
+    const tagSoftKeyBoardInitData data = field == nullptr ? tagSoftKeyBoardInitData() : field->describe();
+    KSInputContext::m_strLimitCondition = QString::fromStdWString(data.limitCondition);
+    return data;
+}
+
 } // namespace
 
 void KSInputContext::install()
@@ -191,19 +200,12 @@ bool KSInputContext::isErrorForGettingFocusWidget()
 
 tagSoftKeyBoardInitData KSInputContext::getSendData()
 {
-    return sendDataOf(InputField::of(getFocusWidget()).get());
+    return describe(getFocusWidget());
 }
 
 tagSoftKeyBoardInitData KSInputContext::getSendData(QLineEdit* edit)
 {
-    return sendDataOf(InputField::of(edit).get());
-}
-
-tagSoftKeyBoardInitData KSInputContext::sendDataOf(const InputField* field)
-{
-    const tagSoftKeyBoardInitData data = field == nullptr ? tagSoftKeyBoardInitData() : field->describe();
-    m_strLimitCondition = QString::fromStdWString(data.limitCondition);
-    return data;
+    return describe(edit);
 }
 
 // --- Keyboard window ----------------------------------------------------------------------------------

@@ -133,7 +133,6 @@ private:
     bool filterRequestSoftwareInputPanel();
     bool filterCloseSoftwareInputPanel();
     bool isErrorForGettingFocusWidget();
-    static SubCommonDefine::tagSoftKeyBoardInitData sendDataOf(const InputField* field);
     bool showForFocusWidget(const SubCommonDefine::tagSoftKeyBoardInitData& data);
     void handleInputString(const std::wstring& text, bool onEnter);
     void checkInputString(InputField& field, const std::wstring& text);
