@@ -92,7 +92,6 @@ FolderPicker::FolderPicker(QWidget* parent)
     : QDialog(parent, Qt::Dialog | Qt::FramelessWindowHint)
     , m_rows(this)
     , m_masks(this, FRAME)
-    , m_background(QStringLiteral(":/ToolBarbg_bluegrid"))
     , m_separator(QStringLiteral(":/Separator_H"))
 {
     setObjectName(QStringLiteral("FolderPickerWindow"));
@@ -476,6 +475,8 @@ void FolderPicker::slotDeleteFolder(std::wstring name)
 void FolderPicker::paintEvent(QPaintEvent* event)
 {
     QDialog::paintEvent(event);
+    if (m_background.isNull()) // large, so it is not read before the dialog is shown
+        m_background.load(QStringLiteral(":/ToolBarbg_bluegrid"));
     QPainter painter(this);
     painter.fillRect(rect(), FRAME_COLOR);
     const QRect inside = rect().marginsRemoved(FRAME);
