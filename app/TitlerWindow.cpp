@@ -214,7 +214,6 @@ void TitlerWindow::paintEvent(QPaintEvent* event)
 
 void TitlerWindow::resizeEvent(QResizeEvent* event)
 {
-    m_background.makeFrames();
     Q_EMIT titlerWindowGeometry(geometry());
     QMainWindow::resizeEvent(event);
 }

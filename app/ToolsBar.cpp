@@ -6,6 +6,7 @@
 #include "touchui/KSPushbutton.h"
 #include "touchui/NewLayout.h"
 #include "touchui/OutsidePressFilter.h"
+#include "touchui/PictureIcon.h"
 
 #include <QAction>
 #include <QBitmap>
@@ -69,9 +70,8 @@ ToolsBar::~ToolsBar() = default;
 ToolsBar::ToolButton ToolsBar::createButton(const QString& iconName, const QPoint& textPoint)
 {
     ToolButton tool;
-    // From a name without suffix, an icon reads the database of MIME types.
-    tool.icon = QIcon(QPixmap(QStringLiteral(":/Icon_") + iconName));
-    tool.disabledIcon = QIcon(QPixmap(QStringLiteral(":/Icon_Disabled_") + iconName));
+    tool.icon = QIcon(new PictureIcon(QStringLiteral(":/Icon_") + iconName));
+    tool.disabledIcon = QIcon(new PictureIcon(QStringLiteral(":/Icon_Disabled_") + iconName));
     tool.button = new KSPushbutton(QString::fromLatin1(TOOL_IMAGES), this);
     tool.button->setObjectName(iconName);
     tool.button->setFixedSize(TOOLBARBTN_SIZE);

@@ -1,7 +1,6 @@
 #include "app/WindowBackground.h"
 
 #include "app/TitlerWindow.h"
-#include "canvas/DrawBoundingRectangle.h"
 
 #include <QImageReader>
 #include <QPainter>
@@ -17,13 +16,6 @@ constexpr QPoint LEFT_FRAME_POS(12, 61);
 
 } // namespace
 
-void WindowBackground::makeFrames()
-{
-    DrawBoundingRectangle frames;
-    m_leftFrame = frames.paintBoundingRectangle(LEFT_FRAME);
-    m_windowFrame = frames.paintBoundingRectangle(WINDOW_FRAME);
-}
-
 void WindowBackground::load()
 {
     QImageReader reader(QStringLiteral(":/PanelBG/Titler_Canvas"));
@@ -36,8 +28,8 @@ void WindowBackground::paint(QPainter& painter)
 {
     if (m_canvasSurround.isNull())
         load();
-    painter.drawPixmap(WINDOW_FRAME_POS, m_windowFrame);
-    painter.drawPixmap(LEFT_FRAME_POS, m_leftFrame);
+    m_windowFrame.paintBackground(painter, WINDOW_FRAME_POS, WINDOW_FRAME);
+    m_leftFrame.paintBackground(painter, LEFT_FRAME_POS, LEFT_FRAME);
     painter.drawPixmap(TitlerWindow::STARTPOINT_OF_CANVASSCENE_BG, m_canvasSurround);
     painter.drawImage(TitlerWindow::VSEPARATOR_RECT, m_vertical);
     painter.drawImage(TitlerWindow::HSEPARATOR_TOP_RECT, m_horizontal);

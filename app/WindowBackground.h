@@ -1,5 +1,7 @@
 #pragma once
 
+#include "canvas/DrawBoundingRectangle.h"
+
 #include <QImage>
 #include <QPixmap>
 
@@ -10,16 +12,15 @@ class QPainter;
 class WindowBackground
 {
 public:
-    // Makes the frames again. Call when the size of the window has changed.
-    void makeFrames();
     // Loads the pictures at the first call.
     void paint(QPainter& painter);
 
 private:
     void load();
 
-    QPixmap m_windowFrame;
-    QPixmap m_leftFrame;
+    // Painted from their pieces: a pixmap as large as the window is mostly its even middle.
+    DrawBoundingRectangle m_windowFrame;
+    DrawBoundingRectangle m_leftFrame;
     QPixmap m_canvasSurround;
     QImage m_vertical; // separators
     QImage m_horizontal;

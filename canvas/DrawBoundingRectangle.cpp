@@ -5,6 +5,8 @@
 namespace
 {
 
+constexpr int LIKE_DIALOG = 7; // kind whose middle is drawn first
+
 QStringList pieceNames(const QString& prefix, const QString& bottom)
 {
     QStringList names;
@@ -25,30 +27,53 @@ DrawBoundingRectangle::DrawBoundingRectangle(QObject* parent)
 {
 }
 
-QPixmap DrawBoundingRectangle::paintBoundingRectangle(int kind)
+DrawBoundingRectangle::Background DrawBoundingRectangle::backgroundOf(int kind) const
 {
     switch (kind) {
     case 1:
-        return drawImage(m_paneOne, QSize(1902, 1064));
+        return {&m_paneOne, QSize(1902, 1064)};
     case 2:
-        return drawImage(m_paneTwo, QSize(547, 1002));
+        return {&m_paneTwo, QSize(547, 1002)};
     case 3:
-        return drawImage(m_smallDialogBase, QSize(389, 121));
+        return {&m_smallDialogBase, QSize(389, 121)};
     case 4:
-        return drawImage(m_dialogBase, QSize(654, 351));
+        return {&m_dialogBase, QSize(654, 351)};
     case 5:
-        return drawImage(m_dialogBase, QSize(1088, 742));
+        return {&m_dialogBase, QSize(1088, 742)};
     case 6:
-        return drawImage(m_paneTwo, QSize(802, 568));
-    case 7:
-        return drawImageLikeAsKSDialog(m_smallDialogBase, QSize(1371, 833));
+        return {&m_paneTwo, QSize(802, 568)};
+    case LIKE_DIALOG:
+        return {&m_smallDialogBase, QSize(1371, 833)};
     case 8:
-        return drawImage(m_paneTwo, QSize(1053, 599));
+        return {&m_paneTwo, QSize(1053, 599)};
     case 9:
-        return drawImage(m_dialogBase, QSize(200, 210));
+        return {&m_dialogBase, QSize(200, 210)};
     default:
-        return QPixmap();
+        return {};
     }
+}
+
+QPixmap DrawBoundingRectangle::paintBoundingRectangle(int kind)
+{
+    const Background background = backgroundOf(kind);
+    if (background.names == nullptr)
+        return QPixmap();
+    return kind == LIKE_DIALOG ? drawImageLikeAsKSDialog(*background.names, background.size)
+                               : drawImage(*background.names, background.size);
+}
+
+void DrawBoundingRectangle::paintBackground(QPainter& painter, const QPoint& corner, int kind)
+{
+    const Background background = backgroundOf(kind);
+    if (background.names == nullptr || kind == LIKE_DIALOG)
+        return;
+    if (m_loaded != *background.names && !loadPieces(*background.names))
+        return;
+    painter.translate(corner);
+    drawTopImage(painter, background.size);
+    drawMiddleImage(painter, background.size);
+    drawBottomImage(painter, background.size);
+    painter.translate(-corner);
 }
 
 bool DrawBoundingRectangle::loadPieces(const QStringList& names)
@@ -56,7 +81,8 @@ bool DrawBoundingRectangle::loadPieces(const QStringList& names)
     if (names.size() != PieceCount)
         return false;
     for (int i = 0; i < PieceCount; ++i)
-        m_pieces[i] = QImage(names.at(i));
+        m_pieces[i] = QImage(names.at(i)).convertToFormat(QImage::Format_ARGB32_Premultiplied);
+    m_loaded = names;
     return true;
 }
 

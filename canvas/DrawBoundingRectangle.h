@@ -3,6 +3,7 @@
 #include <QImage>
 #include <QObject>
 #include <QPixmap>
+#include <QPoint>
 #include <QSize>
 #include <QStringList>
 
@@ -18,6 +19,9 @@ public:
     // Returns the background of one kind of widget, 1 to 9; a null pixmap for any other kind. Pieces whose
     // picture is missing stay transparent.
     QPixmap paintBoundingRectangle(int kind);
+    // Paints the same with its upper-left corner there, without a pixmap of that size. The pictures are kept
+    // until another kind is painted. Does nothing for kind 7, whose pieces overlap.
+    void paintBackground(QPainter& painter, const QPoint& corner, int kind);
 
     // The order of the nine picture names in a list.
     enum Piece {
@@ -39,6 +43,12 @@ public:
     QPixmap drawImageLikeAsKSDialog(const QStringList& names, const QSize& size);
 
 private:
+    struct Background {
+        const QStringList* names = nullptr; // null for an unknown kind
+        QSize size;
+    };
+
+    Background backgroundOf(int kind) const;
     bool loadPieces(const QStringList& names);
     QSize getSpecifiedTopLeftImage() const;
     QSize getSpecifiedBottomImage() const;
@@ -52,5 +62,6 @@ private:
     QStringList m_paneTwo;
     QStringList m_dialogBase;
     QStringList m_smallDialogBase;
+    QStringList m_loaded; // the names of the pieces
     QImage m_pieces[PieceCount];
 };

@@ -92,7 +92,6 @@ FolderPicker::FolderPicker(QWidget* parent)
     : QDialog(parent, Qt::Dialog | Qt::FramelessWindowHint)
     , m_rows(this)
     , m_masks(this, FRAME)
-    , m_background(QStringLiteral(":/ToolBarbg_bluegrid"))
     , m_separator(QStringLiteral(":/Separator_H"))
 {
     setObjectName(QStringLiteral("FolderPickerWindow"));
@@ -192,8 +191,9 @@ void FolderPicker::connectTree()
     connect(m_tree, &QAbstractItemView::pressed, this, &FolderPicker::pressedFolder);
     connect(m_tree, &QTreeView::collapsed, this, &FolderPicker::pressedFolder);
     connect(m_tree, &QTreeView::expanded, this, &FolderPicker::pressedFolder);
-    connect(m_tree, &KSTreeView::signalCurrentChangedByTouch, this, &FolderPicker::slotCurrentChangedByTouch);
-    connect(m_tree, &KSTreeView::signalPressedAndHold, this, &FolderPicker::startEditing);
+    connect(m_tree->touch(), &TreeTouch::currentChangedByTouch, this,
+            &FolderPicker::slotCurrentChangedByTouch);
+    connect(m_tree->touch(), &TreeTouch::pressedAndHeld, this, &FolderPicker::startEditing);
     connect(m_tree->header(), &QHeaderView::sectionClicked, this, &FolderPicker::slotHeaderClicked);
     connect(m_edit.get(), &FolderNameEdit::folderMoved, this, &FolderPicker::folderMoved);
     connect(m_edit.get(), &FolderNameEdit::rowAdded, this, [this] { m_preview->clearThumbnailArea(); });
@@ -475,6 +475,8 @@ void FolderPicker::slotDeleteFolder(std::wstring name)
 void FolderPicker::paintEvent(QPaintEvent* event)
 {
     QDialog::paintEvent(event);
+    if (m_background.isNull()) // large, so it is not read before the dialog is shown
+        m_background.load(QStringLiteral(":/ToolBarbg_bluegrid"));
     QPainter painter(this);
     painter.fillRect(rect(), FRAME_COLOR);
     const QRect inside = rect().marginsRemoved(FRAME);

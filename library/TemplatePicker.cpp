@@ -22,6 +22,7 @@
 #include <QShowEvent>
 #include <memory>
 #include <string>
+#include <utility>
 
 const QSize TemplatePicker::SCREEN_SIZE(SCREEN_WIDTH, SCREEN_HEIGHT);
 const QSize TemplatePicker::TAB_AREA_SIZE(TAB_AREA_WIDTH, TAB_AREA_HIGHT);
@@ -104,7 +105,6 @@ TemplatePicker::TemplatePicker(QWidget* parent)
     createButtons();
     setSystemLanFont(QFont(QStringLiteral("KST")));
     translateText();
-    initImageView();
     initImageView2();
 }
 
@@ -219,6 +219,7 @@ void TemplatePicker::translateText()
 
 void TemplatePicker::showEvent(QShowEvent* event)
 {
+    initImageView();
     QDialog::showEvent(event);
     if (m_frame.isNull()) {
         m_frame = DrawBoundingRectangle().paintBoundingRectangle(DIALOG_FRAME);
@@ -267,8 +268,16 @@ void TemplatePicker::drawHorizontalLine(QPainter& painter)
 
 // --- What the operator and the file manager do with templates ----------------------------------------------
 
+TemplateTab* TemplatePicker::presetTab()
+{
+    initImageView();
+    return m_presetTab;
+}
+
 void TemplatePicker::initImageView()
 {
+    if (std::exchange(m_arePresetsRead, true))
+        return;
     m_presetTab->setTemplates(m_controller.getTemplates(m_reloadRule.language(), m_pin));
 }
 
@@ -282,7 +291,9 @@ void TemplatePicker::reloadTemplates(SystemSetupDef::emSystemLanguageType langua
     if (!m_reloadRule.needsReload(language, m_pin))
         return;
     m_reloadRule.reloaded(language, m_pin);
-    initImageView();
+    m_arePresetsRead = false;
+    if (isVisible())
+        initImageView();
 }
 
 void TemplatePicker::reloadTemplates2()

@@ -61,7 +61,8 @@ public:
     explicit TemplatePicker(QWidget* parent = nullptr);
     ~TemplatePicker() override;
 
-    // Reads the presets again if the language requires it.
+    // Has the presets read again if the language requires it. They are read when they are needed, which is
+    // when the dialog is shown.
     void reloadTemplates(SystemSetupDef::emSystemLanguageType language);
     // Reads the user templates again.
     void reloadTemplates2();
@@ -81,7 +82,8 @@ public:
     void showDialogMaskWidget(bool show) { m_masks.showDialogMaskWidget(show); }
     void showMessageMaskWidget(bool show) { m_masks.showMessageMaskWidget(show); }
 
-    TemplateTab* presetTab() const { return m_presetTab; }
+    // Reads the presets if necessary.
+    TemplateTab* presetTab();
     TemplateTab* userTab() const { return m_userTab; }
 
 Q_SIGNALS:
@@ -134,6 +136,7 @@ private:
     TemplatePickerController m_controller;
     UserTemplatePickerController m_userController;
     TemplateReloadRule m_reloadRule;
+    bool m_arePresetsRead = false;
     bool m_pin = false; // use the Chinese presets for every language
     SystemSetupDef::emInformationModel m_module = SystemSetupDef::emInformationModelDefault;
     bool m_selectedItem = false;

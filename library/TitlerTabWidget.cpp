@@ -1,6 +1,5 @@
 #include "library/TitlerTabWidget.h"
 
-#include "canvas/DrawBoundingRectangle.h"
 #include "touchui/KSTabBar.h"
 
 #include <QPainter>
@@ -20,9 +19,7 @@ TitlerTabWidget::TitlerTabWidget(QWidget* parent) : KSTabWidget(parent)
 
 void TitlerTabWidget::setPainLine(int x, int y)
 {
-    m_frame = DrawBoundingRectangle().paintBoundingRectangle(LIST_PANE);
-    m_frameX = x;
-    m_frameY = y;
+    m_frameCorner = QPoint(x, y);
     update();
 }
 
@@ -30,6 +27,7 @@ void TitlerTabWidget::paintEvent(QPaintEvent* event)
 {
     KSTabWidget::paintEvent(event);
     QPainter painter(this);
-    painter.drawPixmap(m_frameX, m_frameY, m_frame);
+    if (m_frameCorner)
+        m_frame.paintBackground(painter, *m_frameCorner, LIST_PANE);
     painter.fillRect(0, 0, width(), tabBar()->height() - TAB_OVERLAP, DIALOG_COLOR);
 }

@@ -1,8 +1,11 @@
 #pragma once
 
+#include "canvas/DrawBoundingRectangle.h"
 #include "touchui/KSTabWidget.h"
 
-#include <QPixmap>
+#include <QPoint>
+
+#include <optional>
 
 // The tab widget of a picker, which draws the frame of a list pane in its page.
 class TitlerTabWidget : public KSTabWidget
@@ -12,14 +15,13 @@ class TitlerTabWidget : public KSTabWidget
 public:
     explicit TitlerTabWidget(QWidget* parent = nullptr);
 
-    // Creates the frame of a list pane and sets its top left corner, in coordinates of the widget.
+    // Shows the frame of a list pane; x and y are its top left corner, in coordinates of the widget.
     void setPainLine(int x, int y);
 
 protected:
     void paintEvent(QPaintEvent* event) override;
 
 private:
-    QPixmap m_frame;
-    int m_frameX = 0;
-    int m_frameY = 0;
+    DrawBoundingRectangle m_frame;
+    std::optional<QPoint> m_frameCorner; // empty if there is no frame
 };

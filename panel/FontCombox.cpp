@@ -6,13 +6,16 @@
 #include "support/ConfinedPath.h"
 
 #include <QDir>
+#include <QEvent>
 #include <QFileInfo>
 #include <QFontDatabase>
 #include <QFontInfo>
 #include <QPainter>
+#include <QSignalBlocker>
 
 #include <algorithm>
 #include <exception>
+#include <utility>
 
 namespace
 {
@@ -65,11 +68,40 @@ FontCombox::FontCombox(QWidget* parent) : KSCombobox(parent)
 void FontCombox::refreshFontListView(bool isAllItems)
 {
     m_allItems = isAllItems;
+    m_isFilled = false;
+    setFontFamily(m_previousFamily);
+    fillIfNeeded();
+}
+
+void FontCombox::fill()
+{
+    if (std::exchange(m_isFilled, true))
+        return;
+    const QSignalBlocker silent(this); // the base class selects the first row for a moment
     const QStringList candidates =
-        isAllItems ? filterAvailableForSY(TextToolsPanelController().getFontLib()) : m_imported;
+        m_allItems ? filterAvailableForSY(TextToolsPanelController().getFontLib()) : m_imported;
     clear();
     addItems(filterAvailableFamily(candidates));
     setFontFamily(m_previousFamily);
+}
+
+void FontCombox::fillIfNeeded()
+{
+    if (isVisible() && isEnabled())
+        fill();
+}
+
+void FontCombox::showEvent(QShowEvent* event)
+{
+    fillIfNeeded();
+    KSCombobox::showEvent(event);
+}
+
+void FontCombox::changeEvent(QEvent* event)
+{
+    if (event->type() == QEvent::EnabledChange)
+        fillIfNeeded();
+    KSCombobox::changeEvent(event);
 }
 
 QStringList FontCombox::filterAvailableForSY(const QStringList& families) const
@@ -137,6 +169,8 @@ void FontCombox::registerFontFile(const QString& path)
 void FontCombox::setFontFamily(const QString& family)
 {
     setPreviousFamily(family);
+    if (!family.isEmpty())
+        fill();
     setCurrentFamily(
         family.isEmpty() ? -1 : findData(family, Qt::DisplayRole, Qt::MatchExactly | Qt::MatchCaseSensitive));
 }

@@ -17,10 +17,14 @@ public:
 
     explicit FontCombox(QWidget* parent);
 
-    // Fills the list: with true with the appliance's families and the imported ones, with false with the
+    // Chooses what the list offers: with true the appliance's families and the imported ones, with false the
     // imported ones only. A family that the font system cannot resolve is left out. Keeps the current family
-    // if it is still in the list.
+    // if it is still in the list. The list is filled by fill().
     void refreshFontListView(bool isAllItems);
+    // Fills the list if it has changed since it was last filled. Resolving the families is slow, so this is
+    // called only when the list is needed: while the box is shown and enabled, and when it has a family to
+    // show.
+    void fill();
     // Registers one file of the folder of imported fonts; with all, drops every import and registers the
     // whole folder. With fromSettings the path of the folder is read from the settings, otherwise the path
     // from the last call is used. Files that are not fonts are skipped.
@@ -39,15 +43,19 @@ public:
     static QStringList filterAvailableFamily(const QStringList& families);
 
 protected:
+    void changeEvent(QEvent* event) override;
+    void showEvent(QShowEvent* event) override;
     void drawText(QPainter& painter, const QRect& area) override;
     void adjustPopupListSize() override;
 
 private:
     void addSpecialDefaultFont();
     void registerFontFile(const QString& path);
+    void fillIfNeeded();
 
     QStringList m_imported;
     QString m_importFolder;
     bool m_allItems = true;
+    bool m_isFilled = false;
     QString m_previousFamily;
 };

@@ -165,9 +165,17 @@ void RangeOfMoveText::balanceDescription()
                                     m_description->text());
     };
     const int height = area(DESCRIPTIONLABEL_WIDTH).height();
+    // Bisects, since measuring is slow: a text that fits into a width fits into all larger ones.
+    int tooNarrow = -1;
     int width = DESCRIPTIONLABEL_WIDTH;
-    while (area(width - 1).height() == height && area(width - 1).width() < width)
-        --width;
+    while (width - tooNarrow > 1) {
+        const int middle = (tooNarrow + width) / 2;
+        const QRect lines = area(middle);
+        if (lines.height() == height && lines.width() <= middle)
+            width = middle;
+        else
+            tooNarrow = middle;
+    }
     m_description->setContentsMargins(0, 0, qMax(0, DESCRIPTIONLABEL_WIDTH - width - SLACK), 0);
 }
 

@@ -1,6 +1,7 @@
 #include "panel/ToolBox.h"
 
 #include "touchui/KSPushbutton.h"
+#include "touchui/PictureIcon.h"
 
 #include <QHBoxLayout>
 #include <QLabel>
@@ -168,13 +169,12 @@ void ToolBox::setButtonChosen(KSPushbutton* button)
         showIcon(*entry);
 }
 
-// Reads and decodes each icon file once. From a name without suffix, an icon would read the database of MIME
-// types.
+// Reads and decodes each icon file once, and not before it is painted.
 QIcon ToolBox::iconOf(Button& entry, const QString& name)
 {
     auto known = entry.icons.find(name);
     if (known == entry.icons.end())
-        known = entry.icons.insert(name, QIcon(QPixmap(name)));
+        known = entry.icons.insert(name, QIcon(new PictureIcon(name)));
     return *known;
 }
 

@@ -14,8 +14,20 @@ constexpr int EDITOR_MARGIN = 2; // above and below the editor
 
 } // namespace
 
-CustomTreeDelegete::CustomTreeDelegete(KSTreeView* view) : QStyledItemDelegate(view), m_view(view)
+CustomTreeDelegete::CustomTreeDelegete(KSTreeView* view, const KSViewStyle* style)
+    : QStyledItemDelegate(view), m_view(view), m_style(style)
 {
+}
+
+// Returns null if the model of the view is of another class.
+KSTreeModel* CustomTreeDelegete::treeModel() const
+{
+    return qobject_cast<KSTreeModel*>(m_view->model());
+}
+
+QRect CustomTreeDelegete::textRect(const QRect& cell, const QModelIndex& index) const
+{
+    return index.column() == 0 ? m_view->getLayoutForFirstColumn(cell, index).text : m_style->textRect(cell);
 }
 
 void CustomTreeDelegete::paint(QPainter* painter, const QStyleOptionViewItem& option,
@@ -23,18 +35,21 @@ void CustomTreeDelegete::paint(QPainter* painter, const QStyleOptionViewItem& op
 {
     QStyleOptionViewItem cell = option;
     initStyleOption(&cell, index);
-    m_view->viewStyle()->drawControl(QStyle::CE_ItemViewItem, &cell, painter, m_view);
+    m_style->drawControl(QStyle::CE_ItemViewItem, &cell, painter, m_view);
 }
 
 QSize CustomTreeDelegete::sizeHint(const QStyleOptionViewItem&, const QModelIndex& index) const
 {
-    return QSize(m_view->columnWidth(index.column()), m_view->rowHeightOf(index));
+    const KSTreeModel* model = treeModel();
+    const int own = model != nullptr ? model->getItemHeight(index) : 0;
+    const int height = own > 0 ? own : m_view->getDesignAttribute(KSVIEW::DesignRowHeight).toInt();
+    return QSize(m_view->columnWidth(index.column()), height);
 }
 
 QWidget* CustomTreeDelegete::createEditor(QWidget* parent, const QStyleOptionViewItem&,
                                           const QModelIndex& index) const
 {
-    KSTreeModel* model = m_view->treeModel();
+    KSTreeModel* model = treeModel();
     if (model == nullptr || model->factory() == nullptr)
         return nullptr;
     QWidget* editor = model->factory()->createControl(parent, KSModelDataFactory::LineEditControl, index);
@@ -71,14 +86,12 @@ void CustomTreeDelegete::setModelData(QWidget* editor, QAbstractItemModel* model
 void CustomTreeDelegete::updateEditorGeometry(QWidget* editor, const QStyleOptionViewItem& option,
                                               const QModelIndex& index) const
 {
-    const QRect text = index.column() == 0 ? m_view->getLayoutForFirstColumn(option.rect, index).text
-                                           : m_view->viewStyle()->textRect(option.rect);
-    editor->setGeometry(text.adjusted(0, EDITOR_MARGIN, 0, -EDITOR_MARGIN));
+    editor->setGeometry(textRect(option.rect, index).adjusted(0, EDITOR_MARGIN, 0, -EDITOR_MARGIN));
 }
 
 bool CustomTreeDelegete::eventFilter(QObject* object, QEvent* event)
 {
-    const KSTreeModel* model = m_view->treeModel();
+    const KSTreeModel* model = treeModel();
     if (model != nullptr && model->factory() != nullptr && model->factory()->isControlSelfEnding())
         return false;
     return QStyledItemDelegate::eventFilter(object, event);

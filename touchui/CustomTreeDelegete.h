@@ -2,7 +2,9 @@
 
 #include <QStyledItemDelegate>
 
+class KSTreeModel;
 class KSTreeView;
+class KSViewStyle;
 class QLineEdit;
 
 // Paints the cells of a KSTreeView with its style and opens the editors that the model's factory creates.
@@ -10,8 +12,11 @@ class CustomTreeDelegete : public QStyledItemDelegate
 {
     Q_OBJECT
 public:
-    // The view owns the delegate.
-    explicit CustomTreeDelegete(KSTreeView* view);
+    // The view owns the delegate and the style.
+    CustomTreeDelegete(KSTreeView* view, const KSViewStyle* style);
+
+    // Returns the rectangle of the text in a cell, both in viewport coordinates.
+    QRect textRect(const QRect& cell, const QModelIndex& index) const;
 
     void paint(QPainter* painter, const QStyleOptionViewItem& option,
                const QModelIndex& index) const override;
@@ -34,5 +39,8 @@ protected:
     bool eventFilter(QObject* object, QEvent* event) override;
 
 private:
+    KSTreeModel* treeModel() const;
+
     KSTreeView* m_view;
+    const KSViewStyle* m_style;
 };

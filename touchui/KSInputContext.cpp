@@ -43,9 +43,10 @@ bool serviceOwnsState()
     return applicationName() == QLatin1String("Titler");
 }
 
-// Returns the description of the field, null for none, and keeps its pattern.
-tagSoftKeyBoardInitData sendDataOf(const InputField* field)
+// Describes the field of a widget, and keeps the pattern of its validator.
+tagSoftKeyBoardInitData describe(QWidget* widget)
 {
+    const auto field = InputField::of(widget);
     const tagSoftKeyBoardInitData data = field == nullptr ? tagSoftKeyBoardInitData() : field->describe();
     KSInputContext::m_strLimitCondition = QString::fromStdWString(data.limitCondition);
     return data;
@@ -199,12 +200,12 @@ bool KSInputContext::isErrorForGettingFocusWidget()
 
 tagSoftKeyBoardInitData KSInputContext::getSendData()
 {
-    return sendDataOf(InputField::of(getFocusWidget()).get());
+    return describe(getFocusWidget());
 }
 
 tagSoftKeyBoardInitData KSInputContext::getSendData(QLineEdit* edit)
 {
-    return sendDataOf(InputField::of(edit).get());
+    return describe(edit);
 }
 
 // --- Keyboard window ----------------------------------------------------------------------------------

@@ -10,7 +10,8 @@
 #include <QStyleOptionHeader>
 #include <QTouchEvent>
 
-KSTreeHeaderView::KSTreeHeaderView(KSTreeView* view) : QHeaderView(Qt::Horizontal, view), m_view(view)
+KSTreeHeaderView::KSTreeHeaderView(KSTreeView* view, const KSViewStyle* style)
+    : QHeaderView(Qt::Horizontal, view), m_view(view), m_style(style)
 {
     setAttribute(Qt::WA_AcceptTouchEvents);
     viewport()->setAttribute(Qt::WA_AcceptTouchEvents);
@@ -79,7 +80,7 @@ void KSTreeHeaderView::paintSection(QPainter* painter, const QRect& rect, int lo
     initStyleOption(&option);
     option.rect = rect;
     initStyleOptionForIndex(&option, logicalIndex);
-    m_view->viewStyle()->drawControl(QStyle::CE_Header, &option, painter, this);
+    m_style->drawControl(QStyle::CE_Header, &option, painter, this);
 }
 
 void KSTreeHeaderView::paintEvent(QPaintEvent* event)
@@ -88,7 +89,7 @@ void KSTreeHeaderView::paintEvent(QPaintEvent* event)
         QPainter painter(viewport());
         QStyleOptionHeader option;
         option.rect = viewport()->rect();
-        m_view->viewStyle()->drawControl(QStyle::CE_HeaderEmptyArea, &option, &painter, this);
+        m_style->drawControl(QStyle::CE_HeaderEmptyArea, &option, &painter, this);
         return;
     }
     QHeaderView::paintEvent(event);

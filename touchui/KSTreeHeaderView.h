@@ -6,6 +6,7 @@
 #include <QHeaderView>
 
 class KSTreeView;
+class KSViewStyle;
 class QTouchEvent;
 
 // The header of a KSTreeView, which a finger operates like a mouse: a tap on a section sorts by it.
@@ -13,7 +14,8 @@ class KSTreeHeaderView : public QHeaderView
 {
     Q_OBJECT
 public:
-    explicit KSTreeHeaderView(KSTreeView* view);
+    // The view owns the header and the style.
+    KSTreeHeaderView(KSTreeView* view, const KSViewStyle* style);
 
     virtual bool onTouchEvent(QTouchEvent* event);
 
@@ -29,5 +31,6 @@ private:
     void sendMouse(QEvent::Type type, const QPointF& globalPosition);
 
     KSTreeView* m_view;
+    const KSViewStyle* m_style;
     OneFinger m_finger{this};
 };

@@ -6,10 +6,8 @@
 #include "touchui/KSTreeModel.h"
 #include "touchui/TreeCheckStates.h"
 
-#include <QApplication>
 #include <QFontMetrics>
 #include <QKeyEvent>
-#include <QMouseEvent>
 #include <QPainter>
 #include <QScrollBar>
 #include <QTouchEvent>
@@ -23,6 +21,18 @@ const char SCROLL_BAR_STYLE[] =
     "QScrollBar:vertical { width: 32px } QScrollBar:horizontal { height: 32px }"
     "QScrollBar::add-line, QScrollBar::sub-line { width: 0px; height: 0px }"
     "QScrollBar::handle:vertical { min-height: 42px } QScrollBar::handle:horizontal { min-width: 42px }";
+
+QRect firstCellRect(const QTreeView& tree, const QModelIndex& index)
+{
+    return tree.visualRect(index.siblingAtColumn(0));
+}
+
+QScrollBar* makeScrollBar(Qt::Orientation orientation, QWidget* parent)
+{
+    auto* bar = new KSScrollBar(orientation, parent);
+    bar->setStyleSheet(QLatin1String(SCROLL_BAR_STYLE));
+    return bar;
+}
 
 } // namespace
 
@@ -40,13 +50,15 @@ QStringList KSTreeView::s_checkBoxImagesPath = {
 
 KSTreeView::KSTreeView(QWidget* parent)
     : QTreeView(parent)
-    , m_viewStyle(std::make_unique<KSViewStyle>(this))
-    , m_delegate(new CustomTreeDelegete(this))
+    , m_viewStyle(new KSViewStyle(this))
+    , m_delegate(new CustomTreeDelegete(this, m_viewStyle))
 {
-    setStyle(m_viewStyle.get());
+    setStyle(m_viewStyle);
     setItemDelegate(m_delegate);
-    setHeader(new KSTreeHeaderView(this));
-    initScrollBars();
+    setHeader(new KSTreeHeaderView(this, m_viewStyle));
+    setVerticalScrollBar(makeScrollBar(Qt::Vertical, this));
+    setHorizontalScrollBar(makeScrollBar(Qt::Horizontal, this));
+    setHorizontalScrollBarPolicy(Qt::ScrollBarAlwaysOff);
     setFrameShape(QFrame::NoFrame);
     viewport()->setStyleSheet(QStringLiteral("background-color: rgb(51, 51, 51)"));
     setAttribute(Qt::WA_AcceptTouchEvents);
@@ -58,32 +70,15 @@ KSTreeView::KSTreeView(QWidget* parent)
     setVerticalScrollMode(QAbstractItemView::ScrollPerPixel);
     setExpandsOnDoubleClick(false);
     setTextElideMode(Qt::ElideRight);
-    connect(&m_finger, &OneFinger::held, this, &KSTreeView::slotHold);
-    connect(&m_finger, &OneFinger::cancelled, this, &KSTreeView::rest);
-    connect(&m_flicker, &Flicker::started, this, &KSTreeView::motionStarted);
-    connect(&m_flicker, &Flicker::ticked, this, [this] { changeScrollBarValue(getDistance().y()); });
-    connect(&m_flicker, &Flicker::ended, this, &KSTreeView::showLastRowWhole);
+    connect(&m_touch, &TreeTouch::pressed, this, &QAbstractItemView::pressed);
+    connect(&m_touch, &TreeTouch::clicked, this, &QAbstractItemView::clicked);
     connect(this, &KSTreeView::editorEvent, this,
             static_cast<void (QAbstractItemView::*)(const QModelIndex&)>(&QAbstractItemView::edit));
 }
 
-KSTreeView::~KSTreeView()
-{
-    setStyle(nullptr); // this view's style is destroyed before the base class
-}
-
-void KSTreeView::initScrollBars()
-{
-    setVerticalScrollBar(new KSScrollBar(Qt::Vertical, this));
-    setHorizontalScrollBar(new KSScrollBar(Qt::Horizontal, this));
-    for (QScrollBar* bar : {verticalScrollBar(), horizontalScrollBar()})
-        bar->setStyleSheet(QLatin1String(SCROLL_BAR_STYLE));
-    setHorizontalScrollBarPolicy(Qt::ScrollBarAlwaysOff);
-}
-
 void KSTreeView::setModel(QAbstractItemModel* model)
 {
-    cancelPress();
+    m_touch.cancelPress();
     stopFlick();
     m_treeModel = qobject_cast<KSTreeModel*>(model);
     m_loadingMarks.setModel(m_treeModel);
@@ -137,18 +132,6 @@ void KSTreeView::setDesignAttribute(KSVIEW::enumDesignAttributeRole role, const 
     header()->viewport()->update();
 }
 
-int KSTreeView::rowHeightOf(const QModelIndex& index) const
-{
-    const int own = m_treeModel != nullptr ? m_treeModel->getItemHeight(index) : 0;
-    return own > 0 ? own : getDesignAttribute(KSVIEW::DesignRowHeight).toInt();
-}
-
-QColor KSTreeView::headerTextColor(int section) const
-{
-    const QColor own = m_treeModel != nullptr ? m_treeModel->getHeaderTextColor(section) : QColor();
-    return own.isValid() ? own : getDesignAttribute(KSVIEW::DesignHeaderTextColor).value<QColor>();
-}
-
 bool KSTreeView::insertRows(int row, int count, const QModelIndex& parent)
 {
     return model() != nullptr && model()->insertRows(row, count, parent);
@@ -168,11 +151,6 @@ bool KSTreeView::moveToSibling(QModelIndex sibling)
 
 // --- Geometry -----------------------------------------------------------------------------------------
 
-QRect KSTreeView::firstCellRect(const QModelIndex& index) const
-{
-    return visualRect(index.siblingAtColumn(0));
-}
-
 KSViewStyle::FirstColumnLayout KSTreeView::getLayoutForFirstColumn(const QRect& cell,
                                                                    const QModelIndex& index) const
 {
@@ -186,7 +164,7 @@ KSViewStyle::FirstColumnLayout KSTreeView::getLayoutForFirstColumn(const QRect& 
 
 QRect KSTreeView::getCheckBoxRect(const QModelIndex& index) const
 {
-    const QRect cell = firstCellRect(index);
+    const QRect cell = firstCellRect(*this, index);
     return cell.isValid() ? getLayoutForFirstColumn(cell, index).checkBox : QRect();
 }
 
@@ -202,25 +180,15 @@ QRect KSTreeView::getCheckBoxRectForTouch(const QModelIndex& index) const
 
 QRect KSTreeView::getIndicatorRect(const QModelIndex& index) const
 {
-    const QRect cell = firstCellRect(index);
+    const QRect cell = firstCellRect(*this, index);
     if (!cell.isValid() || !model()->hasChildren(index.siblingAtColumn(0)))
         return QRect();
     return getLayoutForFirstColumn(cell, index).indicator;
 }
 
-QRect KSTreeView::indicatorRectForTouch(const QModelIndex& index) const
-{
-    const QRect indicator = getIndicatorRect(index);
-    if (indicator.isNull())
-        return QRect();
-    const QRect row = getIndexVisualRect(index);
-    const int width = getDesignAttribute(KSVIEW::DesignIndentation).toInt();
-    return QRect(indicator.center().x() - width / 2, row.top(), width, row.height());
-}
-
 QRect KSTreeView::getIndexVisualRect(const QModelIndex& index) const
 {
-    const QRect cell = firstCellRect(index);
+    const QRect cell = firstCellRect(*this, index);
     return cell.isValid() ? QRect(0, cell.top(), viewport()->width(), cell.height()) : QRect();
 }
 
@@ -248,8 +216,7 @@ bool KSTreeView::isTextElide(const QModelIndex& index) const
     const QRect cell = visualRect(index);
     if (!cell.isValid())
         return false;
-    const QRect text =
-        index.column() == 0 ? getLayoutForFirstColumn(cell, index).text : m_viewStyle->textRect(cell);
+    const QRect text = m_delegate->textRect(cell, index);
     QStyleOptionViewItem option;
     initViewItemOption(&option);
     option.index = index;
@@ -305,19 +272,14 @@ void KSTreeView::drawBranches(QPainter* painter, const QRect&, const QModelIndex
     option.rect = getIndicatorRect(index);
     option.state = QStyle::State_Children;
     option.state.setFlag(QStyle::State_Open, isExpanded(index));
-    option.state.setFlag(QStyle::State_Enabled, isUsable(index));
+    option.state.setFlag(QStyle::State_Enabled, m_touch.isUsable(index));
     option.state.setFlag(QStyle::State_Sunken, isIndicatorPressed(index));
     m_viewStyle->drawPrimitive(QStyle::PE_IndicatorBranch, &option, painter, this);
 }
 
-bool KSTreeView::isUsable(const QModelIndex& index) const
-{
-    return isEnabled() && index.isValid() && (model()->flags(index) & Qt::ItemIsEnabled);
-}
-
 bool KSTreeView::isIndicatorPressed(const QModelIndex& index) const
 {
-    return m_pressedIndicator.isValid() && m_pressedIndicator == index.siblingAtColumn(0);
+    return m_touch.isIndicatorPressed(index);
 }
 
 // --- Editing ------------------------------------------------------------------------------------------
@@ -393,9 +355,9 @@ KSTreeView::CheckBoxImage KSTreeView::getCheckBoxImageType(const QModelIndex& in
         break;
     }
     int state = 0;
-    if (!isUsable(index))
+    if (!m_touch.isUsable(index))
         state = OnDisabled;
-    else if (m_pressedCheckBox.isValid() && m_pressedCheckBox == index.siblingAtColumn(0))
+    else if (m_touch.isCheckBoxPressed(index))
         state = OnPressed;
     return static_cast<CheckBoxImage>(family + state);
 }
@@ -403,7 +365,7 @@ KSTreeView::CheckBoxImage KSTreeView::getCheckBoxImageType(const QModelIndex& in
 void KSTreeView::changeCheckState(const QModelIndex& index)
 {
     const QModelIndex first = index.siblingAtColumn(0);
-    if (m_treeModel != nullptr && isUsable(first) && m_treeModel->getCheckable(first))
+    if (m_treeModel != nullptr && m_touch.isUsable(first) && m_treeModel->getCheckable(first))
         TreeCheckStates(*m_treeModel).toggle(first);
 }
 
@@ -428,7 +390,7 @@ void KSTreeView::changeCheckStateByNumber(const QModelIndex& index, int number)
 void KSTreeView::setCheckBoxVisible(bool visible)
 {
     m_checkBoxVisible = visible;
-    m_pressedCheckBox = QModelIndex();
+    m_touch.releaseCheckBox();
     viewport()->update();
 }
 
@@ -437,14 +399,6 @@ void KSTreeView::setCheckBoxVisible(bool visible)
 QString KSTreeView::getLoadingImagePath(int step) const
 {
     return TreeLoadingMarks::imagePath(step);
-}
-
-void KSTreeView::dataChanged(const QModelIndex& topLeft, const QModelIndex& bottomRight,
-                             const QList<int>& roles)
-{
-    QTreeView::dataChanged(topLeft, bottomRight, roles);
-    if (roles.contains(KSVIEW::ItemLoadingRole) && topLeft.data(KSVIEW::ItemLoadingRole).toInt() > 0)
-        m_loadingMarks.start();
 }
 
 void KSTreeView::slotUpdateLoadingIcon()
@@ -465,22 +419,14 @@ void KSTreeView::clearRecording()
         m_treeModel->setAttributeOfAll(KSVIEW::ItemRecordingRole, false);
 }
 
-void KSTreeView::showElidedText(const QModelIndex& index)
-{
-    const QRect row = getIndexVisualRect(index);
-    const QRect cell = visualRect(index);
-    const QRect text =
-        index.column() == 0 ? getLayoutForFirstColumn(cell, index).text : m_viewStyle->textRect(cell);
-    m_elidedText.show(QRect(viewport()->mapToGlobal(row.topLeft()), row.size()),
-                      index.data(Qt::DisplayRole).toString(), text.width());
-}
-
 // --- Touch --------------------------------------------------------------------------------------------
 
 bool KSTreeView::event(QEvent* event)
 {
     if (OneFinger::isTouch(event))
         return onTouchEvent(static_cast<QTouchEvent*>(event));
+    if (event->type() == QEvent::Hide)
+        m_touch.rest();
     return event->type() == QEvent::Gesture || QTreeView::event(event);
 }
 
@@ -488,13 +434,13 @@ bool KSTreeView::viewportEvent(QEvent* event)
 {
     if (OneFinger::isTouch(event))
         return onTouchEvent(static_cast<QTouchEvent*>(event));
-    return event->type() == QEvent::Gesture || QTreeView::viewportEvent(event);
+    return event->type() == QEvent::Gesture || m_touch.takesMouse(event) || QTreeView::viewportEvent(event);
 }
 
 bool KSTreeView::onTouchEvent(QTouchEvent* event)
 {
     event->accept();
-    switch (m_finger.follow(event)) {
+    switch (m_touch.follow(event)) {
     case OneFinger::Step::Begin:
         return onTouchBeginEvent(event);
     case OneFinger::Step::Move:
@@ -507,204 +453,28 @@ bool KSTreeView::onTouchEvent(QTouchEvent* event)
     return true;
 }
 
-QPoint KSTreeView::fingerPosition() const
-{
-    return m_finger.positionIn(viewport()).toPoint();
-}
-
 bool KSTreeView::onTouchBeginEvent(QTouchEvent*)
 {
-    const QPoint point = fingerPosition();
-    const bool brake = isAutoFilck();
-    m_flicker.begin(point);
-    if (!brake)
-        sendMouse(QEvent::MouseButtonPress, point);
+    m_touch.fingerPressed();
     return true;
 }
 
 bool KSTreeView::onTouchUpdateEvent(QTouchEvent*)
 {
-    const QPoint point = fingerPosition();
-    m_flicker.follow(point);
-    sendMouse(QEvent::MouseMove, point);
+    m_touch.fingerMoved();
     return true;
 }
 
 bool KSTreeView::onTouchEndEvent(QTouchEvent* event)
 {
-    m_flicker.lift(fingerPosition());
+    m_touch.fingerLifted();
     onTranslateTouchEndEventToMouse(event);
     return true;
 }
 
 void KSTreeView::onTranslateTouchEndEventToMouse(QTouchEvent*)
 {
-    sendMouse(QEvent::MouseButtonRelease, fingerPosition());
-}
-
-// Ends the press without a tap and stops any motion.
-void KSTreeView::rest()
-{
-    m_flicker.cancel();
-    cancelPress();
-    m_elidedText.hide();
-}
-
-void KSTreeView::sendMouse(QEvent::Type type, const QPoint& point)
-{
-    QMouseEvent mouse = OneFinger::mouseEvent(type, point, viewport()->mapToGlobal(point));
-    m_sendingMouse = true;
-    if (type == QEvent::MouseButtonPress)
-        mousePressEvent(&mouse);
-    else if (type == QEvent::MouseButtonRelease)
-        mouseReleaseEvent(&mouse);
-    else
-        mouseMoveEvent(&mouse);
-    m_sendingMouse = false;
-}
-
-// --- Mouse, including touches that are passed on as mouse events --------------------------------------
-
-void KSTreeView::mousePressEvent(QMouseEvent* event)
-{
-    event->accept();
-    const QPoint point = event->position().toPoint();
-    if (event->button() != Qt::LeftButton || (!m_sendingMouse && m_finger.isDown()))
-        return;
-    if (!m_sendingMouse) {
-        const bool brake = isAutoFilck();
-        m_flicker.begin(point);
-        if (brake)
-            return;
-    }
-    beginPress(point);
-}
-
-void KSTreeView::mouseMoveEvent(QMouseEvent* event)
-{
-    event->accept();
-    const QPoint point = event->position().toPoint();
-    if (!m_sendingMouse && (event->buttons() & Qt::LeftButton) && !m_finger.isDown())
-        m_flicker.follow(point);
-    if (m_pressState == NotPressed)
-        return;
-    if ((point - m_pressPoint).manhattanLength() > QApplication::startDragDistance()) {
-        m_finger.stopHold();
-        m_moved = true;
-    }
-    if (m_pressedCheckBox.isValid() && !getCheckBoxRectForTouch(m_pressedCheckBox).contains(point)) {
-        m_pressedCheckBox = QModelIndex();
-        viewport()->update();
-    }
-    if (m_pressedIndicator.isValid() && !indicatorRectForTouch(m_pressedIndicator).contains(point)) {
-        m_pressedIndicator = QModelIndex();
-        viewport()->update();
-    }
-}
-
-void KSTreeView::mouseReleaseEvent(QMouseEvent* event)
-{
-    event->accept();
-    const QPoint point = event->position().toPoint();
-    if (event->button() != Qt::LeftButton || (!m_sendingMouse && m_finger.isDown()))
-        return;
-    if (!m_sendingMouse)
-        m_flicker.lift(point);
-    const bool isTap = m_pressState == Pressed && !m_moved &&
-                       (point - m_pressPoint).manhattanLength() <= QApplication::startDragDistance();
-    if (isTap)
-        tap(point);
-    cancelPress();
-}
-
-void KSTreeView::mouseDoubleClickEvent(QMouseEvent* event)
-{
-    mousePressEvent(event);
-}
-
-void KSTreeView::beginPress(const QPoint& point)
-{
-    cancelPress();
-    m_pressState = Pressed;
-    m_pressPoint = point;
-    const QModelIndex index = indexAt(point);
-    m_pressIndex = index;
-    if (!isUsable(index))
-        return;
-    const QModelIndex first = index.siblingAtColumn(0);
-    if (getCheckBoxRectForTouch(first).contains(point))
-        m_pressedCheckBox = first;
-    else if (indicatorRectForTouch(first).contains(point))
-        m_pressedIndicator = first;
-    else
-        m_finger.startHold(m_holdInterval);
-    viewport()->update();
-}
-
-void KSTreeView::cancelPress()
-{
-    m_finger.stopHold();
-    m_pressState = NotPressed;
-    m_moved = false;
-    m_pressIndex = QModelIndex();
-    m_pressedCheckBox = QModelIndex();
-    m_pressedIndicator = QModelIndex();
-    viewport()->update();
-}
-
-// Uses what was pressed, even if the list has moved by a few pixels since. Receivers may change the model.
-void KSTreeView::tap(const QPoint& point)
-{
-    const QPersistentModelIndex index = m_pressIndex;
-    if (m_pressedCheckBox.isValid()) {
-        if (getCheckBoxRectForTouch(m_pressedCheckBox).contains(point))
-            changeCheckState(m_pressedCheckBox);
-    } else if (m_pressedIndicator.isValid()) {
-        if (indicatorRectForTouch(m_pressedIndicator).contains(point))
-            setExpanded(m_pressedIndicator, !isExpanded(m_pressedIndicator));
-    } else if (isUsable(index)) {
-        makeCurrent(index);
-        if (index.isValid())
-            Q_EMIT signalCurrentChangedByTouch(index);
-        if (index.isValid())
-            Q_EMIT clicked(index);
-    }
-}
-
-void KSTreeView::makeCurrent(const QModelIndex& index)
-{
-    const QPersistentModelIndex kept = index;
-    setCurrentIndex(index);
-    if (kept.isValid())
-        Q_EMIT pressed(kept);
-}
-
-void KSTreeView::slotHold()
-{
-    if (m_pressState != Pressed || !isUsable(m_pressIndex))
-        return;
-    m_pressState = Held;
-    const QPersistentModelIndex index = m_pressIndex;
-    makeCurrent(index);
-    if (index.isValid() && isTextElide(index))
-        showElidedText(index);
-    if (index.isValid())
-        Q_EMIT signalPressedAndHold(index);
-}
-
-// --- Motion -------------------------------------------------------------------------------------------
-
-void KSTreeView::motionStarted()
-{
-    setVerticalScrollMode(QAbstractItemView::ScrollPerPixel);
-    m_finger.stopHold();
-    m_elidedText.hide();
-}
-
-void KSTreeView::showLastRowWhole()
-{
-    if (verticalScrollBar()->value() == verticalScrollBar()->maximum())
-        scrollToBottom();
+    m_touch.endFingerPress();
 }
 
 QPoint KSTreeView::getDistance()
@@ -718,15 +488,8 @@ void KSTreeView::changeScrollBarValue(int offset)
     bar->setValue(FlickMotion::scrolledValue(bar->value(), offset, bar->minimum(), bar->maximum()));
 }
 
-void KSTreeView::hideEvent(QHideEvent* event)
-{
-    rest();
-    QTreeView::hideEvent(event);
-}
-
 void KSTreeView::allTimersReset()
 {
-    m_finger.restartHold();
-    m_elidedText.restartIfActive();
+    m_touch.restartTimers();
     m_loadingMarks.restartIfActive();
 }

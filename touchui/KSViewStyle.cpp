@@ -1,5 +1,6 @@
 #include "touchui/KSViewStyle.h"
 
+#include "touchui/KSTreeModel.h"
 #include "touchui/KSTreeView.h"
 #include "touchui/KSVIEW.h"
 
@@ -33,6 +34,7 @@ QRect centeredSquare(const QRect& area, int size)
 
 KSViewStyle::KSViewStyle(KSTreeView* view) : m_view(view)
 {
+    setParent(view);
 }
 
 QPixmap KSViewStyle::picture(const QString& path)
@@ -48,6 +50,13 @@ QPixmap KSViewStyle::picture(const QString& path)
 QColor KSViewStyle::color(int role) const
 {
     return m_view->getDesignAttribute(static_cast<KSVIEW::enumDesignAttributeRole>(role)).value<QColor>();
+}
+
+QColor KSViewStyle::headerTextColor(int section) const
+{
+    const auto* model = qobject_cast<KSTreeModel*>(m_view->model());
+    const QColor own = model != nullptr ? model->getHeaderTextColor(section) : QColor();
+    return own.isValid() ? own : color(KSVIEW::DesignHeaderTextColor);
 }
 
 int KSViewStyle::length(int role) const
@@ -138,7 +147,7 @@ void KSViewStyle::drawHeaderLabel(QPainter* painter, const QStyleOptionHeader& o
     font.setPixelSize(length(KSVIEW::DesignFontSize));
     painter->save();
     painter->setFont(font);
-    painter->setPen(m_view->headerTextColor(option.section));
+    painter->setPen(headerTextColor(option.section));
     painter->drawText(rect, static_cast<int>(Qt::AlignVCenter | Qt::AlignLeft) | Qt::TextSingleLine,
                       QFontMetrics(font).elidedText(option.text, Qt::ElideRight, rect.width()));
     painter->restore();

@@ -22,7 +22,7 @@ public:
         QRect text;
     };
 
-    // The view provides the design values; it owns this style and outlives it.
+    // The view provides the design values; it owns this style.
     explicit KSViewStyle(KSTreeView* view);
 
     // Draws every element, including CE_Header, CE_ItemViewItem and PE_IndicatorBranch.
@@ -57,6 +57,7 @@ private:
     static QPixmap picture(const QString& path);
     void drawCentered(QPainter* painter, const QRect& rect, const QString& path) const;
     QColor color(int role) const;
+    QColor headerTextColor(int section) const;
     int length(int role) const;
 
     KSTreeView* m_view;

@@ -23,6 +23,21 @@ QString TreeLoadingMarks::imagePath(int step)
     return QStringLiteral(":/Views/Loading_Icon-%1").arg(number, 2, 10, QLatin1Char('0'));
 }
 
+void TreeLoadingMarks::setModel(KSTreeModel* model)
+{
+    if (m_model != nullptr)
+        disconnect(m_model, nullptr, this, nullptr);
+    m_model = model;
+    if (m_model != nullptr)
+        connect(m_model, &QAbstractItemModel::dataChanged, this, &TreeLoadingMarks::startIfLoading);
+}
+
+void TreeLoadingMarks::startIfLoading(const QModelIndex& topLeft, const QModelIndex&, const QList<int>& roles)
+{
+    if (roles.contains(KSVIEW::ItemLoadingRole) && topLeft.data(KSVIEW::ItemLoadingRole).toInt() > 0)
+        start();
+}
+
 void TreeLoadingMarks::start()
 {
     if (m_model != nullptr && !m_timer.isActive())

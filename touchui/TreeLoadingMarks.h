@@ -1,6 +1,7 @@
 #pragma once
 
 #include <QObject>
+#include <QPointer>
 #include <QString>
 #include <QTimer>
 
@@ -17,8 +18,9 @@ public:
     // step counts from 1 to 8; other values wrap around.
     static QString imagePath(int step);
 
-    // The model is not owned. Null for none.
-    void setModel(KSTreeModel* model) { m_model = model; }
+    // Sets the model, which is not owned; null for none. The animation starts when one of its rows begins to
+    // load.
+    void setModel(KSTreeModel* model);
     void start();
     void stop() { m_timer.stop(); }
     // Restarts the time of a step if the animation is running.
@@ -29,6 +31,8 @@ public Q_SLOTS:
     void turn();
 
 private:
-    KSTreeModel* m_model = nullptr;
+    void startIfLoading(const QModelIndex& topLeft, const QModelIndex& bottomRight, const QList<int>& roles);
+
+    QPointer<KSTreeModel> m_model;
     QTimer m_timer;
 };

@@ -1,6 +1,7 @@
 #include "canvas/DrawBoundingRectangle.h"
 
 #include <QImage>
+#include <QPainter>
 #include <QTemporaryDir>
 #include <QTest>
 
@@ -18,6 +19,8 @@ private Q_SLOTS:
     void missingPicturesStayTransparent();
     void sizesOfKinds_data();
     void sizesOfKinds();
+    void paintsTheSameWithoutAPixmap_data();
+    void paintsTheSameWithoutAPixmap();
 
 private:
     QTemporaryDir m_folder;
@@ -28,6 +31,8 @@ private:
 
 void tst_drawboundingrectangle::initTestCase()
 {
+    Q_INIT_RESOURCE(UILibrary);
+    Q_INIT_RESOURCE(TitlerToolResource);
     for (int i = 0; i < DrawBoundingRectangle::PieceCount; ++i) {
         // The lower row is higher than the upper one.
         QImage piece(10, i <= DrawBoundingRectangle::BottomLeft ? 8 : 5, QImage::Format_ARGB32);
@@ -119,6 +124,35 @@ void tst_drawboundingrectangle::sizesOfKinds()
     QFETCH(QSize, size);
     DrawBoundingRectangle painter;
     QCOMPARE(painter.paintBoundingRectangle(kind).size(), size);
+}
+
+void tst_drawboundingrectangle::paintsTheSameWithoutAPixmap_data()
+{
+    QTest::addColumn<int>("kind");
+    for (const int kind : {1, 2, 3, 4, 5, 6, 8, 9, 10})
+        QTest::addRow("%d", kind) << kind;
+}
+
+void tst_drawboundingrectangle::paintsTheSameWithoutAPixmap()
+{
+    QFETCH(int, kind);
+    DrawBoundingRectangle background;
+    QImage wanted(1920, 1080, QImage::Format_RGB32);
+    wanted.fill(QColor(40, 90, 20));
+    const QImage plain = wanted;
+    QImage painted = wanted;
+    {
+        QPainter painter(&wanted);
+        painter.drawPixmap(7, 11, background.paintBoundingRectangle(kind));
+    }
+    QPainter painter(&painted);
+    background.paintBackground(painter, QPoint(7, 11), 2); // another kind first
+    painter.fillRect(painted.rect(), QColor(40, 90, 20));
+    background.paintBackground(painter, QPoint(7, 11), kind);
+    QCOMPARE(painter.worldTransform(), QTransform());
+    painter.end();
+    QCOMPARE(painted, wanted);
+    QCOMPARE(wanted == plain, kind == 10);
 }
 
 QTEST_MAIN(tst_drawboundingrectangle)

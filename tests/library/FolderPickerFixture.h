@@ -50,7 +50,7 @@ public:
         picker = std::make_unique<FolderPicker>(window.get());
         tester = std::make_unique<QAbstractItemModelTester>(
             model(), QAbstractItemModelTester::FailureReportingMode::QtTest);
-        tree()->setHoldInterval(HOLD);
+        tree()->touch()->setHoldInterval(HOLD);
         picker->updateTreeView();
         picker->show();
         QVERIFY(QTest::qWaitForWindowExposed(picker.get(), PATIENCE_MS));
@@ -131,7 +131,7 @@ public:
     void hold(const QModelIndex& index) const
     {
         QVERIFY(index.isValid());
-        QSignalSpy held(tree(), &KSTreeView::signalPressedAndHold);
+        QSignalSpy held(tree()->touch(), &TreeTouch::pressedAndHeld);
         const QPoint point = tree()->viewport()->mapTo(picker.get(), place(index));
         touch->press(picker.get(), point);
         QTRY_COMPARE(held.count(), 1);

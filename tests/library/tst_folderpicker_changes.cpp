@@ -473,7 +473,7 @@ private Q_SLOTS:
         QFETCH(quint32, usualSeed);
         const RandomSeed seed(usualSeed);
         QRandomGenerator random(seed);
-        f.tree()->setHoldInterval(1);
+        f.tree()->touch()->setHoldInterval(1);
         for (int step = 0; step < 600; ++step) {
             const QString done = randomStep(random);
             QCoreApplication::processEvents();

@@ -112,6 +112,25 @@ private Q_SLOTS:
         QVERIFY(button("selectPresetButton")->isEnabled());
     }
 
+    void presetsAreReadWhenTheyAreShown()
+    {
+        makePicker();
+        m_fixture.makePresets("templates_en", {"lower"});
+        m_fixture.makePresets("templates_chs", {"xia"});
+        m_picker->reloadTemplates(SystemSetupDef::emSystemLanguageChinese);
+        m_fixture.makePresets("templates_chs", {"xin"});
+        show();
+        const QList<TemplateItem*> shown = m_picker->findChildren<TemplateItem*>();
+        QCOMPARE(shown.size(), names(presets()).size());
+        QVERIFY(names(presets()).contains("xin"));
+        m_picker->reloadTemplates(SystemSetupDef::emSystemLanguageEnglish); // at once while it is shown
+        QCOMPARE(m_picker->findChildren<TemplateItem*>().size(), 1);
+        m_picker->hide();
+        m_fixture.makePresets("templates_en", {"strap"});
+        show();
+        QCOMPARE(names(presets()), QStringList{"lower"}); // read once for a language
+    }
+
     void theModelOfTheApplianceChangesNoSet()
     {
         m_fixture.makePresets("templates_en", {"lower"});

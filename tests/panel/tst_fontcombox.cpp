@@ -34,6 +34,7 @@ private Q_SLOTS:
     void fontsOutsideAreNotImported();
     void removedFontLeavesTheList();
     void paintsTheDisplayName();
+    void isFilledWhenItIsNeeded();
 
 private:
     FontCombox* combo() const { return m_box->comboBox(); }
@@ -184,6 +185,7 @@ void tst_fontcombox::importedFileJoinsTheList()
     QVERIFY(changed.isEmpty());
     // Another start finds it in the folder.
     FamilyToolBox later(nullptr);
+    later.comboBox()->fill();
     QVERIFY(later.comboBox()->findText(QStringLiteral(TITLER_IMPORTED_FAMILY)) >= 0);
 }
 
@@ -205,6 +207,7 @@ void tst_fontcombox::brokenFilesArePassedOver()
     QCOMPARE(rows(), before);
     // A folder with such files does not prevent the start, either.
     FamilyToolBox later(nullptr);
+    later.comboBox()->fill();
     QVERIFY(later.comboBox()->findText(QStringLiteral("KST")) >= 0);
     QVERIFY(QFile::remove(pipe) && broken.remove() && empty.remove());
 }
@@ -259,6 +262,35 @@ void tst_fontcombox::paintsTheDisplayName()
     // The length of "KST Medium" is between that of "KST" and that of the display name of the other family.
     QVERIFY(inkEnd(shortName) > 80);
     QVERIFY(inkEnd(longName) > inkEnd(shortName));
+}
+
+void tst_fontcombox::isFilledWhenItIsNeeded()
+{
+    QWidget window;
+    FamilyToolBox hidden(&window);
+    const FontCombox* box = hidden.comboBox();
+    QSignalSpy changed(&hidden, &FamilyToolBox::familyChange);
+    QCOMPARE(box->count(), 0);
+    hidden.setFontFamily(QStringLiteral("DejaVu Serif")); // asked for a family: filled while hidden
+    QCOMPARE(hidden.getFontFamily(), QStringLiteral("DejaVu Serif"));
+    QCOMPARE(box->count(), combo()->count());
+
+    hidden.resetInitializeStyle(); // no family, and disabled
+    hidden.modifyComboxItem(false);
+    window.show();
+    QVERIFY(box->count() > 1); // still what it was
+    hidden.setWidgetEnabled();
+    QCOMPARE(box->count(), 1);
+    QCOMPARE(box->currentIndex(), -1);
+    hidden.modifyComboxItem(true); // at once while it is shown and enabled
+    QCOMPARE(box->count(), combo()->count());
+    QCOMPARE(box->currentIndex(), -1);
+    window.hide();
+    hidden.modifyComboxItem(false);
+    QVERIFY(box->count() > 1);
+    window.show();
+    QCOMPARE(box->count(), 1);
+    QVERIFY(changed.isEmpty());
 }
 
 QTEST_MAIN(tst_fontcombox)

@@ -66,7 +66,7 @@ void tst_kstreeview::tapSelectsOnRelease()
 {
     QSignalSpy pressed(m_tree.get(), &QAbstractItemView::pressed);
     QSignalSpy clicked(m_tree.get(), &QAbstractItemView::clicked);
-    QSignalSpy current(m_tree.get(), &KSTreeView::signalCurrentChangedByTouch);
+    QSignalSpy current(m_tree->touch(), &TreeTouch::currentChangedByTouch);
     QTest::touchEvent(m_area, m_device).press(0, rowPoint(2), m_area);
     QVERIFY(!m_tree->currentIndex().isValid());
     QTest::touchEvent(m_area, m_device).release(0, rowPoint(2) + QPoint(3, 3), m_area);
@@ -130,8 +130,8 @@ void tst_kstreeview::slidingOffTheIndicatorDoesNothing()
 
 void tst_kstreeview::holdMakesCurrentAndTells()
 {
-    m_tree->setHoldInterval(30);
-    QSignalSpy held(m_tree.get(), &KSTreeView::signalPressedAndHold);
+    m_tree->touch()->setHoldInterval(30);
+    QSignalSpy held(m_tree->touch(), &TreeTouch::pressedAndHeld);
     QSignalSpy pressed(m_tree.get(), &QAbstractItemView::pressed);
     QSignalSpy clicked(m_tree.get(), &QAbstractItemView::clicked);
     QTest::touchEvent(m_area, m_device).press(0, rowPoint(3), m_area);
@@ -147,8 +147,8 @@ void tst_kstreeview::holdMakesCurrentAndTells()
 
 void tst_kstreeview::movementCancelsTheHold()
 {
-    m_tree->setHoldInterval(50);
-    QSignalSpy held(m_tree.get(), &KSTreeView::signalPressedAndHold);
+    m_tree->touch()->setHoldInterval(50);
+    QSignalSpy held(m_tree->touch(), &TreeTouch::pressedAndHeld);
     // Sideways, so that no motion starts.
     QTest::touchEvent(m_area, m_device).press(0, rowPoint(3), m_area);
     QTest::touchEvent(m_area, m_device)
@@ -287,8 +287,8 @@ void tst_kstreeview::otherWidgetIsLockedOut()
 
 void tst_kstreeview::cancelledTouchSelectsNothing()
 {
-    m_tree->setHoldInterval(40);
-    QSignalSpy held(m_tree.get(), &KSTreeView::signalPressedAndHold);
+    m_tree->touch()->setHoldInterval(40);
+    QSignalSpy held(m_tree->touch(), &TreeTouch::pressedAndHeld);
     QTest::touchEvent(m_area, m_device).press(0, rowPoint(2), m_area);
     QTouchEvent cancel(QEvent::TouchCancel, m_device);
     QApplication::sendEvent(m_area, &cancel);
@@ -315,7 +315,7 @@ void tst_kstreeview::lockedUnderTheFingerItWorksAfterwards()
     const std::unique_ptr<KSLockObject> lock(KSEventMutexLockObject::createFactory(nullptr));
     QWidget* const area = onTheHeader ? m_tree->header()->viewport() : m_area;
     const QPoint point = onTheHeader ? QPoint(100, 20) : rowPoint(2);
-    QSignalSpy held(m_tree.get(), &KSTreeView::signalPressedAndHold);
+    QSignalSpy held(m_tree->touch(), &TreeTouch::pressedAndHeld);
     QSignalSpy clicked(m_tree.get(), &KSTreeView::clicked);
     QSignalSpy sorted(m_tree->header(), &QHeaderView::sectionClicked);
     QTest::touchEvent(area, m_device).press(0, point, area);
@@ -331,8 +331,8 @@ void tst_kstreeview::lockedUnderTheFingerItWorksAfterwards()
 
 void tst_kstreeview::hidingEndsEverything()
 {
-    m_tree->setHoldInterval(40);
-    QSignalSpy held(m_tree.get(), &KSTreeView::signalPressedAndHold);
+    m_tree->touch()->setHoldInterval(40);
+    QSignalSpy held(m_tree->touch(), &TreeTouch::pressedAndHeld);
     swipe(rowPoint(8), -60, 3);
     QVERIFY(m_tree->isAutoFilck());
     m_tree->hide();

@@ -227,7 +227,7 @@ void tst_kstreeview_editing::heldLongNameShowsABalloon()
     QVERIFY(!m_tree->isTextElide(folder));
     m_model->setData(folder, QString(120, QLatin1Char('W')));
     QVERIFY(m_tree->isTextElide(folder));
-    m_tree->setHoldInterval(30);
+    m_tree->touch()->setHoldInterval(30);
     QTest::touchEvent(m_area, m_device).press(0, rowPoint(1), m_area);
     QTRY_VERIFY(shownTip() != nullptr);
     QTest::touchEvent(m_area, m_device).move(0, rowPoint(1) + QPoint(0, -4), m_area);
