@@ -17,6 +17,9 @@ public:
     // Makes the small picture for the list at once (bigSize false) or all picture files in the background
     // (bigSize true). The archive is read before the call returns; null does nothing.
     virtual void makeThumbnail(const Archive* archive, bool bigSize) = 0;
+    // Call when a title that is shown begins to change: all its pictures will be made when it is left. An
+    // implementation may begin with what takes long.
+    virtual void expectPictures(const Archive& /*archive*/) {}
     // Returns whether all pictures are written.
     virtual bool makePictureThreadIsFinished() = 0;
     // Returns the number of titles whose pictures are not written yet. As long as it decreases, waiting makes
