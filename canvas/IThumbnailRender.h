@@ -3,6 +3,7 @@
 #include <QImage>
 #include <QObject>
 #include <QString>
+#include <QThread>
 
 class Archive;
 
@@ -25,6 +26,8 @@ public:
     // Returns the number of titles whose pictures are not written yet. As long as it decreases, waiting makes
     // sense.
     virtual int unfinishedTitles() { return makePictureThreadIsFinished() ? 0 : 1; }
+    // Waits until the pictures of another title are written, at most so many milliseconds.
+    virtual void waitForProgress(int longest) { QThread::msleep(static_cast<unsigned long>(longest)); }
     // Call when a folder was renamed: its titles and the pictures still to be written belong to the new path.
     // Both paths without a "/" at the end.
     virtual void folderRenamed(const QString& /*before*/, const QString& /*after*/) {}

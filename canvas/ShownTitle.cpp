@@ -14,7 +14,6 @@
 #include <QDir>
 #include <QElapsedTimer>
 #include <QFileInfo>
-#include <QThread>
 #include <algorithm>
 #include <iterator>
 #include <limits>
@@ -138,7 +137,7 @@ bool ShownTitle::waitForPictures() const
             left = now;
             idle.restart();
         }
-        QThread::msleep(PICTURE_POLL);
+        m_render->waitForProgress(PICTURE_POLL);
     }
     return isEditFinish();
 }

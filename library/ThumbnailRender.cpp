@@ -113,6 +113,12 @@ int ThumbnailRender::unfinishedTitles()
     return static_cast<int>(m_bigPictures.size()) + m_pictureThread.unfinished();
 }
 
+void ThumbnailRender::waitForProgress(int longest)
+{
+    if (m_bigPictures.empty())
+        m_pictureThread.waitForProgress(longest);
+}
+
 void ThumbnailRender::folderRenamed(const QString& before, const QString& after)
 {
     for (const std::unique_ptr<BigPicture>& job : m_bigPictures)

@@ -54,6 +54,7 @@ public:
     // so that callers can wait without an event loop.
     bool makePictureThreadIsFinished() override;
     int unfinishedTitles() override;
+    void waitForProgress(int longest) override;
     void folderRenamed(const QString& before, const QString& after) override;
 
     // Called before the scenes are cleared. For subclasses with resources of their own.
