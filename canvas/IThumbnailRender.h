@@ -3,6 +3,7 @@
 #include <QImage>
 #include <QObject>
 #include <QString>
+#include <QThread>
 
 class Archive;
 
@@ -17,11 +18,16 @@ public:
     // Makes the small picture for the list at once (bigSize false) or all picture files in the background
     // (bigSize true). The archive is read before the call returns; null does nothing.
     virtual void makeThumbnail(const Archive* archive, bool bigSize) = 0;
+    // Call when a title that is shown begins to change: all its pictures will be made when it is left. An
+    // implementation may begin with what takes long.
+    virtual void expectPictures(const Archive& /*archive*/) {}
     // Returns whether all pictures are written.
     virtual bool makePictureThreadIsFinished() = 0;
     // Returns the number of titles whose pictures are not written yet. As long as it decreases, waiting makes
     // sense.
     virtual int unfinishedTitles() { return makePictureThreadIsFinished() ? 0 : 1; }
+    // Waits until the pictures of another title are written, at most so many milliseconds.
+    virtual void waitForProgress(int longest) { QThread::msleep(static_cast<unsigned long>(longest)); }
     // Call when a folder was renamed: its titles and the pictures still to be written belong to the new path.
     // Both paths without a "/" at the end.
     virtual void folderRenamed(const QString& /*before*/, const QString& /*after*/) {}

@@ -14,7 +14,6 @@
 #include <QDir>
 #include <QElapsedTimer>
 #include <QFileInfo>
-#include <QThread>
 #include <algorithm>
 #include <iterator>
 #include <limits>
@@ -90,6 +89,13 @@ bool ShownTitle::writeFile(const TextObjectList& texts, const GraphicsPixmap* ba
     return m_controller->saveArchiveChange(path(), m_archive.get());
 }
 
+void ShownTitle::setPicturesNeeded()
+{
+    if (!m_picturesNeeded && m_archive && m_render)
+        m_render->expectPictures(*m_archive);
+    m_picturesNeeded = true;
+}
+
 void ShownTitle::makeNeededPictures()
 {
     const QFileInfo title(path());
@@ -113,7 +119,7 @@ void ShownTitle::makeSmallPicture()
         return;
     if (m_render)
         m_render->makeThumbnail(m_archive.get(), false);
-    m_picturesNeeded = true;
+    setPicturesNeeded();
 }
 
 bool ShownTitle::isEditFinish() const
@@ -131,7 +137,7 @@ bool ShownTitle::waitForPictures() const
             left = now;
             idle.restart();
         }
-        QThread::msleep(PICTURE_POLL);
+        m_render->waitForProgress(PICTURE_POLL);
     }
     return isEditFinish();
 }

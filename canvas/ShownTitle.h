@@ -32,7 +32,7 @@ public:
     bool save(const TextObjectList& texts, const GraphicsPixmap* background);
 
     // Marks the pictures as out of date.
-    void setPicturesNeeded() { m_picturesNeeded = true; }
+    void setPicturesNeeded();
     // Makes the pictures if they are out of date.
     void makeNeededPictures();
     // Makes the pictures if one is missing or older than the title.

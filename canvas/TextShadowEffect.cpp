@@ -1,6 +1,7 @@
 #include "canvas/TextShadowEffect.h"
 
 #include "canvas/GraphicsText.h"
+#include "canvas/ShadowPainter.h"
 
 #include <QPaintDevice>
 #include <QPainter>
@@ -34,7 +35,24 @@ void TextShadowEffect::drawPicture(const QPainter& painter, QRect area)
     QPainter picturePainter(&m_picture);
     picturePainter.setRenderHints(painter.renderHints());
     picturePainter.setWindow(area);
-    QGraphicsDropShadowEffect::draw(&picturePainter);
+    drawOnce(picturePainter);
+}
+
+void TextShadowEffect::drawOnce(QPainter& painter)
+{
+    const ShadowPainter shadow(offset(), blurRadius(), color());
+    QPoint place;
+    QPixmap source;
+    if (shadow.isServed())
+        source = sourcePixmap(Qt::DeviceCoordinates, &place, PadToEffectiveBoundingRect);
+    if (source.width() < 2 || source.height() < 2 || source.devicePixelRatio() != 1.0) {
+        QGraphicsDropShadowEffect::draw(&painter);
+        return;
+    }
+    const QTransform transform = painter.worldTransform();
+    painter.setWorldTransform(QTransform());
+    shadow.draw(painter, place, source);
+    painter.setWorldTransform(transform);
 }
 
 void TextShadowEffect::draw(QPainter* painter)
@@ -42,7 +60,7 @@ void TextShadowEffect::draw(QPainter* painter)
     const QRect area = boundingRectFor(sourceBoundingRect(Qt::DeviceCoordinates)).toAlignedRect();
     if (!isWorthKeeping(*painter) || qint64(area.width()) * area.height() > LARGEST_PICTURE) {
         m_picture = QPixmap();
-        QGraphicsDropShadowEffect::draw(painter);
+        drawOnce(*painter);
         return;
     }
     const QTransform transform = painter->worldTransform();

@@ -36,6 +36,7 @@ private:
     };
 
     bool isWorthKeeping(const QPainter& painter) const;
+    void drawOnce(QPainter& painter);
     void drawPicture(const QPainter& painter, QRect area);
 
     GraphicsText& m_item;

@@ -22,13 +22,14 @@ constexpr std::size_t END_OF_BLOCK = 256;
 constexpr std::size_t FIRST_LENGTH = 257;
 constexpr std::size_t LITERALS = 286; // bytes, the end of a block, and lengths
 constexpr std::size_t DISTANCES = 30;
-using LiteralCounts = std::array<std::uint32_t, LITERALS>;
-using DistanceCounts = std::array<std::uint32_t, DISTANCES>;
 
-struct Code {
-    std::uint32_t bits = 0; // the first is the lowest
-    std::uint32_t number = 0;
-};
+using Code = DeflateWriter::Code;
+
+// Returns two codes as one, which is at most as long as two of bytes, or one and the bits that follow it.
+constexpr Code joined(Code first, Code second)
+{
+    return {first.bits | second.bits << first.number, first.number + second.number};
+}
 
 // Lengths and distances are written as a symbol for their top bits, and the bits below.
 struct Split {
@@ -121,6 +122,12 @@ std::array<Code, N> codesFor(const std::array<std::uint32_t, N>& counts, unsigne
 
 } // namespace
 
+// How often each symbol occurs.
+struct DeflateWriter::Counts {
+    std::array<std::uint32_t, LITERALS> literals;
+    std::array<std::uint32_t, DISTANCES> distances;
+};
+
 struct DeflateWriter::Codes {
     std::array<Code, LITERALS> literals;
     std::array<Code, DISTANCES> distances;
@@ -134,6 +141,11 @@ inline void DeflateWriter::Bits::put(std::uint64_t bits, unsigned number)
     end += pendingNumber / 8;
     pending >>= pendingNumber & ~7U;
     pendingNumber &= 7;
+}
+
+inline void DeflateWriter::Bits::put(const Code& first, const Code& second)
+{
+    put(first.bits | std::uint64_t(second.bits) << first.number, first.number + second.number);
 }
 
 QByteArray DeflateWriter::finish(Ending ending)
@@ -155,24 +167,40 @@ void DeflateWriter::writeBlock(bool isLast)
     m_out.resize(size + static_cast<qsizetype>(m_count) * MAX_TOKEN_SIZE + MAX_BLOCK_OVERHEAD);
     m_bits.end = m_out.data() + size;
 
-    LiteralCounts literals{};
-    DistanceCounts distances{};
-    for (std::size_t i = 0; i < m_count; ++i) {
-        const Token token = m_tokens[i];
-        if (token.number == 0) {
-            ++literals[LENGTHS[token.length].symbol];
-            ++distances[splitDistance(token.value).symbol];
-        }
-        for (unsigned byte = 0; byte < token.number; ++byte)
-            ++literals[token.value >> 8 * byte & 0xff];
-    }
-    literals[END_OF_BLOCK] = 1;
-    const Codes codes{codesFor(literals, MAX_CODE_BITS), codesFor(distances, MAX_CODE_BITS)};
+    const Counts counts = countSymbols();
+    const Codes codes{codesFor(counts.literals, MAX_CODE_BITS), codesFor(counts.distances, MAX_CODE_BITS)};
     m_bits.put(isLast ? 1 : 0, 1);
     m_bits.put(2, 2); // with codes of its own
     writeCodes(codes);
     writeTokens(codes);
     m_count = 0;
+}
+
+// Counts the bytes of a pixel apart from each other: those of neighbours are often equal, and a number that
+// was just written would have to be waited for.
+DeflateWriter::Counts DeflateWriter::countSymbols() const
+{
+    Counts counts{};
+    std::array<std::array<std::uint32_t, 256>, 4> bytes{};
+    for (std::size_t i = 0; i < m_count; ++i) {
+        const Token token = m_tokens[i];
+        if (token.number == 0) {
+            ++counts.literals[LENGTHS[token.length].symbol];
+            ++counts.distances[splitDistance(token.value).symbol];
+            continue;
+        }
+        ++bytes[0][token.value & 0xff];
+        if (token.number == 1)
+            continue;
+        ++bytes[1][token.value >> 8 & 0xff];
+        ++bytes[2][token.value >> 16 & 0xff];
+        if (token.number == 4)
+            ++bytes[3][token.value >> 24];
+    }
+    for (std::size_t byte = 0; byte < bytes[0].size(); ++byte)
+        counts.literals[byte] = bytes[0][byte] + bytes[1][byte] + bytes[2][byte] + bytes[3][byte];
+    counts.literals[END_OF_BLOCK] = 1;
+    return counts;
 }
 
 // Writes the lengths of both codes, as symbols of a third one, in which runs of zeros have symbols of their
@@ -218,33 +246,19 @@ void DeflateWriter::writeTokens(const Codes& codes)
     Bits out = m_bits; // in registers
     for (std::size_t i = 0; i < m_count; ++i) {
         const Token token = m_tokens[i];
-        std::uint64_t bits = 0;
-        unsigned number = 0;
-        const auto append = [&](std::uint64_t more, unsigned moreNumber) {
-            bits |= more << number;
-            number += moreNumber;
-        };
-        const auto appendByte = [&](int index) {
-            const Code code = codes.literals[token.value >> 8 * index & 0xff];
-            append(code.bits, code.number);
-        };
+        const auto byte = [&](int index) { return codes.literals[token.value >> 8 * index & 0xff]; };
         if (token.number == 0) {
             const Split length = LENGTHS[token.length];
             const Split distance = splitDistance(token.value);
-            append(codes.literals[length.symbol].bits, codes.literals[length.symbol].number);
-            append(length.below, length.number);
-            append(codes.distances[distance.symbol].bits, codes.distances[distance.symbol].number);
-            append(distance.below, distance.number);
+            out.put(joined(codes.literals[length.symbol], {length.below, length.number}),
+                    joined(codes.distances[distance.symbol], {distance.below, distance.number}));
+        } else if (token.number == 4) {
+            out.put(joined(byte(0), byte(1)), joined(byte(2), byte(3)));
+        } else if (token.number == 3) {
+            out.put(joined(byte(0), byte(1)), byte(2));
         } else {
-            appendByte(0);
-            if (token.number > 1) {
-                appendByte(1);
-                appendByte(2);
-            }
-            if (token.number > 3)
-                appendByte(3);
+            out.put(byte(0), {});
         }
-        out.put(bits, number);
     }
     out.put(codes.literals[END_OF_BLOCK].bits, codes.literals[END_OF_BLOCK].number);
     m_bits = out;

@@ -32,7 +32,14 @@ public:
     // Ends the part, to which something was added, and returns it.
     QByteArray finish(Ending ending);
 
+    // A Huffman code.
+    struct Code {
+        std::uint32_t bits = 0; // the first is the lowest
+        std::uint32_t number = 0;
+    };
+
 private:
+    struct Counts;
     struct Codes;
     struct Token {
         std::uint32_t value;  // bytes, or the distance of a match
@@ -42,6 +49,8 @@ private:
     // The end of what is written.
     struct Bits {
         void put(std::uint64_t bits, unsigned number);
+        // Puts both, the first one first.
+        void put(const Code& first, const Code& second);
 
         char* end = nullptr;       // of the whole bytes
         std::uint64_t pending = 0; // bits that do not fill a byte, the first is the lowest
@@ -56,6 +65,7 @@ private:
         m_tokens[m_count++] = token;
     }
     void writeBlock(bool isLast);
+    Counts countSymbols() const;
     void writeCodes(const Codes& codes);
     void writeTokens(const Codes& codes);
 

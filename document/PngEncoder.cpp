@@ -23,6 +23,9 @@ namespace
 
 constexpr qint64 STRIP_SIZE = 1 << 20; // bytes before compression, about
 constexpr int MAX_THREADS = 4;
+// Bytes; at least what a file has beside its compressed lines.
+constexpr qsizetype SIZE_WITHOUT_DATA = 128;
+constexpr qsizetype CHUNK_SIZE_WITHOUT_DATA = 12;
 
 // Compressors whose buffers are kept for the next picture.
 std::mutex gMutex;
@@ -139,7 +142,12 @@ QByteArray PngEncoder::encode(const QImage& image, int stripHeight, int threads)
     if (parts.empty())
         return {};
 
-    QByteArray file("\x89PNG\r\n\x1a\n", 8);
+    qsizetype size = SIZE_WITHOUT_DATA;
+    for (const PngStrip::Part& part : parts)
+        size += CHUNK_SIZE_WITHOUT_DATA + part.bytes.size();
+    QByteArray file;
+    file.reserve(size);
+    file.append("\x89PNG\r\n\x1a\n", 8);
     const char colorType = image.hasAlphaChannel() ? 6 : 2;
     appendChunk(file, "IHDR",
                 {number(image.width()), number(image.height()),

@@ -169,7 +169,8 @@ void PngStrip::addPixels(int begin, int end)
         const int first = ++x;
         while (x < end && pixels[x] == pixel)
             ++x;
-        addRun((x - first) * m_pixelSize, pixel == 0 ? 1 : m_pixelSize);
+        if (x > first)
+            addRun((x - first) * m_pixelSize, pixel == 0 ? 1 : m_pixelSize);
     }
 }
 

@@ -76,6 +76,13 @@ bool PictureThread::isThreadWaiting() const
     return m_unfinished == 0;
 }
 
+void PictureThread::waitForProgress(int longest)
+{
+    QMutexLocker lock(&m_mutex);
+    if (m_unfinished > 0)
+        m_progress.wait(&m_mutex, static_cast<unsigned long>(longest));
+}
+
 void PictureThread::run()
 {
     AlternateStack::useInThisThread();
@@ -97,7 +104,9 @@ void PictureThread::run()
         if (job.hadTitle && !hasTitle(*job.archive))
             removePictures(*job.archive);
         job = Job(); // frees the images before the job counts as finished
+        QMutexLocker lock(&m_mutex);
         --m_unfinished;
+        m_progress.wakeAll();
     }
 }
 

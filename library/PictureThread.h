@@ -39,6 +39,10 @@ public:
     // Returns the number of jobs queued or being written. Any thread.
     int unfinished() const { return m_unfinished; }
 
+    // Waits until a job is finished, at most so many milliseconds; not at all without jobs. Any thread but
+    // this one.
+    void waitForProgress(int longest);
+
     // Redirects queued jobs for titles of a renamed folder to its new path. Any thread.
     void folderRenamed(const QString& before, const QString& after);
 
@@ -62,6 +66,7 @@ private:
 
     QMutex m_mutex; // guards the queue and the stop flag
     QWaitCondition m_condition;
+    QWaitCondition m_progress;
     std::deque<Job> m_jobs;
     bool m_stop = false;
     std::atomic<int> m_unfinished{0};

@@ -1,9 +1,10 @@
 #include "library/ThumbnailRender.h"
 
-#include "canvas/BackgroundPicture.h"
 #include "canvas/GraphicsPixmap.h"
 #include "canvas/GraphicsText.h"
 #include "document/Archive.h"
+#include "document/HalfPicture.h"
+#include "document/RasterPool.h"
 #include "document/TText.h"
 #include "support/LogManager.h"
 
@@ -34,6 +35,8 @@ const double TO_RASTER = 0.5;
 const double CANVAS_RATIO = 2.0 / 3.0;
 const double RASTER_RATIO = 1.0;
 
+constexpr int IDLE_TIME = 60000; // ms until memory that is kept for the next pictures is given back
+
 // Limits the bounding rectangles to the raster, so that a text far outside it takes no time to paint.
 void limitTextsToRaster(const QGraphicsScene& scene)
 {
@@ -58,7 +61,7 @@ void logBoundingRect(const GraphicsText& text, int id)
 
 QImage renderScene(QGraphicsScene& scene, QSize size)
 {
-    QImage image(size, QImage::Format_ARGB32_Premultiplied);
+    QImage image = RasterPool::take(size);
     image.fill(Qt::transparent);
     QPainter painter(&image);
     painter.setRenderHint(QPainter::Antialiasing);
@@ -75,11 +78,15 @@ ThumbnailRender::ThumbnailRender(QObject* parent) : IThumbnailRender(parent)
     // Each scene is filled, rendered once and cleared, so an index would not pay off.
     m_middleScene.setItemIndexMethod(QGraphicsScene::NoIndex);
     m_bigScene.setItemIndexMethod(QGraphicsScene::NoIndex);
+    m_idleTime.setSingleShot(true);
+    m_idleTime.setInterval(IDLE_TIME);
+    connect(&m_idleTime, &QTimer::timeout, this, &ThumbnailRender::giveBackMemory);
 }
 
 ThumbnailRender::~ThumbnailRender()
 {
     m_bigPictures.clear(); // each job waits for its decoder
+    m_background.reset();
     clearMiddleSizeCanvasScene();
     clearBigSizeCanvasScene();
 }
@@ -104,6 +111,12 @@ bool ThumbnailRender::makePictureThreadIsFinished()
 int ThumbnailRender::unfinishedTitles()
 {
     return static_cast<int>(m_bigPictures.size()) + m_pictureThread.unfinished();
+}
+
+void ThumbnailRender::waitForProgress(int longest)
+{
+    if (m_bigPictures.empty())
+        m_pictureThread.waitForProgress(longest);
 }
 
 void ThumbnailRender::folderRenamed(const QString& before, const QString& after)
@@ -171,52 +184,71 @@ void ThumbnailRender::makeBigSizeThumbnail(const Archive& archive)
     auto job = std::make_unique<BigPicture>();
     job->archive = std::make_unique<Archive>(archive);
     job->hadTitle = QFile::exists(QString::fromStdString(archive.getPath()));
-    const QString background = archive.getFullPathOfBgResourceBig();
-    const auto announce = [this, job = job.get()] {
-        job->isDecoded = true;
-        QMetaObject::invokeMethod(this, &ThumbnailRender::drawDecodedBigPictures, Qt::QueuedConnection);
-    };
-    if (background.isEmpty()) {
-        announce();
-    } else {
-        job->decoder = std::async(std::launch::async, [job = job.get(), background, announce] {
-            job->background = BackgroundPicture::read(background);
-            announce();
-        });
-    }
+    keepBackground(archive);
+    job->background = m_background;
     m_bigPictures.push_back(std::move(job));
+    announceDecoded();
+}
+
+void ThumbnailRender::expectPictures(const Archive& archive)
+{
+    keepBackground(archive);
+}
+
+// Makes m_background that of the title.
+void ThumbnailRender::keepBackground(const Archive& archive)
+{
+    m_idleTime.start();
+    const QString path = archive.getFullPathOfBgResourceBig();
+    if (path.isEmpty())
+        m_background.reset();
+    else if (!m_background || !m_background->isThatOf(path))
+        m_background = std::make_shared<DecodedBackground>(path, [this] { announceDecoded(); });
+}
+
+void ThumbnailRender::giveBackMemory()
+{
+    if (m_background && m_background->isDone()) // deleting another one would wait for its thread
+        m_background.reset();
+    RasterPool::clear();
+}
+
+// Called in any thread.
+void ThumbnailRender::announceDecoded()
+{
+    QMetaObject::invokeMethod(this, &ThumbnailRender::drawDecodedBigPictures, Qt::QueuedConnection);
 }
 
 // Draws the next picture whose background is decoded. Decoding 1920x1080 takes at least as long as drawing
 // the texts, so it is done in another thread.
 void ThumbnailRender::drawDecodedBigPictures()
 {
-    if (!m_bigPictures.empty() && m_bigPictures.front()->isDecoded)
+    if (m_background && m_background->isDone())
+        m_background->takeResult();
+    if (!m_bigPictures.empty() && m_bigPictures.front()->isDecoded())
         drawNextBigPicture();
     // Draws only one picture per event.
-    if (!m_bigPictures.empty() && m_bigPictures.front()->isDecoded)
-        QMetaObject::invokeMethod(this, &ThumbnailRender::drawDecodedBigPictures, Qt::QueuedConnection);
+    if (!m_bigPictures.empty() && m_bigPictures.front()->isDecoded())
+        announceDecoded();
 }
 
 void ThumbnailRender::drawNextBigPicture()
 {
     const std::unique_ptr<BigPicture> job = std::move(m_bigPictures.front());
     m_bigPictures.pop_front();
-    if (job->decoder.valid())
-        job->decoder.wait();
     const QFileInfo title(QString::fromStdString(job->archive->getPath()));
     if (job->hadTitle && !title.exists() && title.dir().exists())
         return; // the title was deleted meanwhile
-    createBigSizeCanvasSceneUsingArchiveData(*job->archive, job->background);
+    createBigSizeCanvasSceneUsingArchiveData(
+        *job->archive, job->background ? job->background->picture()->pixmap() : QPixmap());
     saveBigSizeThumnail(*job->archive, renderBigAndMiddleSizeCanvasScene());
     clearBigSizeCanvasScene();
 }
 
 void ThumbnailRender::createBigSizeCanvasSceneUsingArchiveData(const Archive& archive,
-                                                               const QImage& background)
+                                                               const QPixmap& background)
 {
-    m_bigBackground =
-        new GraphicsPixmap(archive.getFullPathOfBgResourceBig(), QPixmap::fromImage(background));
+    m_bigBackground = new GraphicsPixmap(archive.getFullPathOfBgResourceBig(), background);
     m_bigScene.addItem(m_bigBackground);
     m_bigBackground->setPos(0, 0);
     m_bigBackground->setZValue(archive.getBgPointZ());
@@ -235,7 +267,9 @@ void ThumbnailRender::createBigSizeCanvasSceneUsingArchiveData(const Archive& ar
 QList<QImage> ThumbnailRender::renderBigAndMiddleSizeCanvasScene()
 {
     const QImage big = renderScene(m_bigScene, THUMBNAIL_BIG_SIZE);
-    const QImage middle = big.scaled(THUMBNAIL_MIDDLE_SIZE, Qt::IgnoreAspectRatio, Qt::SmoothTransformation);
+    QImage middle = RasterPool::take(THUMBNAIL_MIDDLE_SIZE);
+    if (!big.isNull() && !middle.isNull())
+        HalfPicture::reduce(big, middle);
     return {big, middle};
 }
 

@@ -1,6 +1,7 @@
 #pragma once
 
 #include "canvas/IThumbnailRender.h"
+#include "library/DecodedBackground.h"
 #include "library/PictureThread.h"
 
 #include <QColor>
@@ -9,9 +10,8 @@
 #include <QList>
 #include <QRect>
 #include <QSize>
-#include <atomic>
+#include <QTimer>
 #include <deque>
-#include <future>
 #include <memory>
 
 class Archive;
@@ -23,6 +23,9 @@ class GraphicsText;
 // The fast stage renders a small picture for the list at once, without writing files. The slow stage renders
 // the 1920x1080 picture and passes it to a thread that writes all four files; it is used when another title
 // is shown. GUI thread only; the files are written by the PictureThread.
+//
+// The decoded background that was drawn last, or will be drawn next, is kept for the next pictures until no
+// pictures have been made or expected for a while.
 class ThumbnailRender : public IThumbnailRender
 {
     Q_OBJECT
@@ -45,10 +48,13 @@ public:
     // With true runs the slow stage, which queues the files: another thread decodes the background, and the
     // picture is drawn in a later turn of the event loop. Null does nothing. The record is not changed.
     void makeThumbnail(const Archive* archive, bool bigSize) override;
+    // Has another thread decode the background.
+    void expectPictures(const Archive& archive) override;
     // Returns whether every queued picture is written. Draws the pictures that are still to be drawn first,
     // so that callers can wait without an event loop.
     bool makePictureThreadIsFinished() override;
     int unfinishedTitles() override;
+    void waitForProgress(int longest) override;
     void folderRenamed(const QString& before, const QString& after) override;
 
     // Called before the scenes are cleared. For subclasses with resources of their own.
@@ -59,7 +65,10 @@ private:
     void makeMiddleAndSmallSizeThumbnail(const Archive& archive);
     void makeBigSizeThumbnail(const Archive& archive);
     void createMiddleSizeCanvasSceneUsingArchiveData(const Archive& archive);
-    void createBigSizeCanvasSceneUsingArchiveData(const Archive& archive, const QImage& background);
+    void createBigSizeCanvasSceneUsingArchiveData(const Archive& archive, const QPixmap& background);
+    void keepBackground(const Archive& archive);
+    void giveBackMemory();
+    void announceDecoded();
     void drawDecodedBigPictures();
     void drawNextBigPicture();
     QImage renderMiddleSizeCanvasScene();
@@ -73,12 +82,14 @@ private:
     struct BigPicture {
         std::unique_ptr<Archive> archive;
         bool hadTitle = false; // whether the title file existed when the job was queued
-        QImage background;
-        std::atomic<bool> isDecoded = false; // whether background is set
-        std::future<void> decoder;
+        std::shared_ptr<DecodedBackground> background; // null for a title without one
+
+        bool isDecoded() const { return !background || background->isDone(); }
     };
 
     std::deque<std::unique_ptr<BigPicture>> m_bigPictures;
+    std::shared_ptr<DecodedBackground> m_background; // of the latest title; null for one without
+    QTimer m_idleTime{this};
     QGraphicsScene m_middleScene;
     QGraphicsScene m_bigScene;
     GraphicsPixmap* m_middleBackground = nullptr; // owned by m_middleScene

@@ -1,5 +1,5 @@
-// Pictures encoded as PNG files, decoded again by libpng, Qt, and ffmpeg where it is installed. TITLER_SEED
-// repeats a run of the random pictures, TITLER_PICTURES changes their number.
+// Pictures encoded as PNG files, decoded again by libpng, Qt and ffmpeg. TITLER_SEED repeats a run of the
+// random pictures, TITLER_PICTURES changes their number.
 #include "document/PngEncoder.h"
 #include "tests/support/RandomSeed.h"
 
@@ -365,8 +365,7 @@ private Q_SLOTS:
     void ffmpegDecodesThem()
     {
         const QString program = QStandardPaths::findExecutable("ffmpeg");
-        if (program.isEmpty())
-            QSKIP("ffmpeg is not installed");
+        QVERIFY2(!program.isEmpty(), "ffmpeg is not installed");
         QTemporaryDir folder;
         for (const QImage::Format format : FORMATS) {
             for (const Content content :

@@ -5,6 +5,7 @@
 
 #include "library/PictureThread.h"
 
+#include <QElapsedTimer>
 #include <QSemaphore>
 #include <QTest>
 
@@ -35,6 +36,7 @@ class tst_picturethread : public QObject
 
 private Q_SLOTS:
     void finishedStates();
+    void waitingEndsWithTheJob();
     void refusedJobs();
     void filesAndSizes();
     void transparentParts();
@@ -64,6 +66,25 @@ void tst_picturethread::finishedStates()
     QVERIFY(!thread.isThreadWaiting());
     reporter.goOn.release();
     QTRY_VERIFY(thread.isThreadWaiting());
+}
+
+void tst_picturethread::waitingEndsWithTheJob()
+{
+    FakeTitleChangeReporter reporter(FakeTitleChangeReporter::Pictures::Hold);
+    const auto archive = LibraryFixture::makeRecord(m_fixture.makeFolder(QStringLiteral("waiting")),
+                                                    QStringLiteral("t"), QString());
+    PictureThread thread;
+    thread.waitForProgress(PATIENCE_MS); // comes back at once, since there is nothing to wait for
+    thread.addArchive(archive.get(), pictures(Qt::red));
+    QVERIFY(reporter.reached.tryAcquire(1, 20000));
+    thread.waitForProgress(10);
+    QVERIFY(!thread.isThreadWaiting());
+    reporter.goOn.release();
+    QElapsedTimer timer;
+    timer.start();
+    thread.waitForProgress(PATIENCE_MS);
+    QVERIFY(thread.isThreadWaiting());
+    QVERIFY(!timer.hasExpired(PATIENCE_MS));
 }
 
 void tst_picturethread::refusedJobs()

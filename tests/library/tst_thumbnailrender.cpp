@@ -3,6 +3,8 @@
 #include "tests/support/FullDisk.h"
 #include "tests/support/LogFixture.h"
 
+#include "canvas/BackgroundPicture.h"
+#include "document/RasterPool.h"
 #include "document/TShadow.h"
 #include "library/ThumbnailRender.h"
 #include "tests/support/Patience.h"
@@ -12,6 +14,8 @@
 #include <QSignalSpy>
 #include <QTest>
 #include <QThread>
+#include <QTimer>
+#include <memory>
 
 namespace
 {
@@ -49,6 +53,10 @@ private Q_SLOTS:
     void slowStageReplacesNothingElse();
     void slowStageDrawsWhileTheEventsGoOn();
     void waitingWithoutEventsDrawsWhatIsLeft();
+    void backgroundIsKeptForTheNextPictures();
+    void changedBackgroundIsDrawn();
+    void expectedBackgroundIsDecodedBefore();
+    void memoryIsGivenBackWhenIdle();
     void textsStandAtOneAndAHalfTimesTheirPlace();
     void textOutsideTheRasterIsHarmless();
     void middlePictureIsTheBigOneReduced();
@@ -74,6 +82,19 @@ private:
         return finished ? QImage(title.path() + QLatin1Char('/') + title.completeBaseName() +
                                  QLatin1String(suffix))
                         : QImage();
+    }
+    static void makeFiles(ThumbnailRender& render, const Archive& archive)
+    {
+        render.makeThumbnail(&archive, true);
+        QTRY_VERIFY_WITH_TIMEOUT(render.makePictureThreadIsFinished(), PATIENCE_MS);
+    }
+    // Returns the colour of the picture for air where there is no text.
+    static QColor airPixel(const Archive& archive)
+    {
+        const QFileInfo title(QString::fromStdString(archive.getPath()));
+        return QImage(title.path() + QLatin1Char('/') + title.completeBaseName() +
+                      QStringLiteral("_1920.png"))
+            .pixelColor(5, 5);
     }
     static void paint(const QString& path, QSize size, const QColor& colour)
     {
@@ -349,6 +370,103 @@ void tst_thumbnailrender::waitingWithoutEventsDrawsWhatIsLeft()
     while (!render.makePictureThreadIsFinished() && time.elapsed() < PATIENCE_MS)
         QThread::msleep(1); // as the window does when it closes: no events come in
     QCOMPARE(QImage(folder + QStringLiteral("/t_1920.png")).pixelColor(5, 5), QColor(20, 90, 40));
+}
+
+void tst_thumbnailrender::backgroundIsKeptForTheNextPictures()
+{
+    const QString folder = m_fixture.makeFolder(QStringLiteral("kept"));
+    const QString path = folder + QStringLiteral("/bg.png");
+    paint(path, QSize(1920, 1080), QColor(20, 90, 40));
+    const auto archive = LibraryFixture::makeRecord(folder, QStringLiteral("t"), QStringLiteral("Kept"));
+    archive->setBgResourceBig("bg.png");
+    ThumbnailRender render;
+    QVERIFY(!BackgroundPicture::find(path));
+    makeFiles(render, *archive);
+    QCOMPARE(airPixel(*archive), QColor(20, 90, 40));
+    const std::weak_ptr<const BackgroundPicture> first = BackgroundPicture::find(path);
+    QVERIFY(!first.expired());
+    makeFiles(render, *archive);
+    QCOMPARE(airPixel(*archive), QColor(20, 90, 40));
+    QCOMPARE(BackgroundPicture::find(path), first.lock());
+
+    // Only one is kept.
+    const QString other = folder + QStringLiteral("/other.png");
+    paint(other, QSize(1920, 1080), QColor(90, 40, 20));
+    archive->setBgResourceBig("other.png");
+    makeFiles(render, *archive);
+    QCOMPARE(airPixel(*archive), QColor(90, 40, 20));
+    QVERIFY(first.expired());
+    QVERIFY(BackgroundPicture::find(other));
+    archive->setBgResourceBig("");
+    makeFiles(render, *archive);
+    QCOMPARE(airPixel(*archive).alpha(), 0);
+    QVERIFY(!BackgroundPicture::find(other));
+}
+
+void tst_thumbnailrender::changedBackgroundIsDrawn()
+{
+    const QString folder = m_fixture.makeFolder(QStringLiteral("repainted"));
+    const QString path = folder + QStringLiteral("/bg.png");
+    paint(path, QSize(1920, 1080), QColor(20, 90, 40));
+    const auto archive = LibraryFixture::makeRecord(folder, QStringLiteral("t"), QStringLiteral("Painted"));
+    archive->setBgResourceBig("bg.png");
+    ThumbnailRender render;
+    makeFiles(render, *archive);
+    paint(path, QSize(1920, 1080), QColor(40, 20, 90));
+    makeFiles(render, *archive);
+    QCOMPARE(airPixel(*archive), QColor(40, 20, 90));
+    // Also between the first change of the title and the making of its pictures.
+    render.expectPictures(*archive);
+    paint(path, QSize(1920, 1080), QColor(20, 90, 40));
+    makeFiles(render, *archive);
+    QCOMPARE(airPixel(*archive), QColor(20, 90, 40));
+    QVERIFY(QFile::remove(path));
+    makeFiles(render, *archive);
+    QCOMPARE(airPixel(*archive).alpha(), 0);
+}
+
+void tst_thumbnailrender::expectedBackgroundIsDecodedBefore()
+{
+    const QString folder = m_fixture.makeFolder(QStringLiteral("expected"));
+    const QString path = folder + QStringLiteral("/bg.png");
+    paint(path, QSize(1920, 1080), QColor(20, 90, 40));
+    const auto archive = LibraryFixture::makeRecord(folder, QStringLiteral("t"), QStringLiteral("Expected"));
+    archive->setBgResourceBig("bg.png");
+    ThumbnailRender render;
+    render.expectPictures(*archive);
+    QTRY_VERIFY(BackgroundPicture::find(path));
+    const auto picture = BackgroundPicture::find(path);
+    QVERIFY(!QFile::exists(folder + QStringLiteral("/t_1920.png")));
+    QVERIFY(render.makePictureThreadIsFinished());
+    makeFiles(render, *archive);
+    QCOMPARE(airPixel(*archive), QColor(20, 90, 40));
+    QCOMPARE(BackgroundPicture::find(path), picture);
+
+    // A title without a background gets none.
+    archive->setBgResourceBig("");
+    render.expectPictures(*archive);
+    makeFiles(render, *archive);
+    QCOMPARE(airPixel(*archive).alpha(), 0);
+}
+
+void tst_thumbnailrender::memoryIsGivenBackWhenIdle()
+{
+    const QString folder = m_fixture.makeFolder(QStringLiteral("idle"));
+    const QString path = folder + QStringLiteral("/bg.png");
+    paint(path, QSize(1920, 1080), QColor(20, 90, 40));
+    const auto archive = LibraryFixture::makeRecord(folder, QStringLiteral("t"), QStringLiteral("Idle"));
+    archive->setBgResourceBig("bg.png");
+    ThumbnailRender render;
+    makeFiles(render, *archive);
+    QVERIFY(RasterPool::keptBytes() > 0);
+    QVERIFY(BackgroundPicture::find(path));
+    auto* idle = render.findChild<QTimer*>();
+    QVERIFY(idle && idle->isActive());
+    idle->start(0); // otherwise it takes a minute
+    QTRY_COMPARE(RasterPool::keptBytes(), qsizetype(0));
+    QVERIFY(!BackgroundPicture::find(path));
+    makeFiles(render, *archive);
+    QCOMPARE(airPixel(*archive), QColor(20, 90, 40));
 }
 
 void tst_thumbnailrender::textsStandAtOneAndAHalfTimesTheirPlace()
