@@ -15,7 +15,7 @@ ArchiveItem* TitleSelection::operation() const
 void TitleSelection::select(ArchiveItem* item)
 {
     if (item)
-        m_selected = item;
+        m_selected = HeldArchiveItem(item);
 }
 
 void TitleSelection::showSelected(ArchiveItem* item)
@@ -38,7 +38,7 @@ void TitleSelection::mark(ArchiveItem* item)
 {
     if (!item)
         return;
-    m_operation = item;
+    m_operation = HeldArchiveItem(item);
     item->setStyleSheet(item == m_selected ? ArchiveItem::OPERATE_AND_SELECT_STATE
                                            : ArchiveItem::OPERATE_AND_UN_SELECT_STATE);
 }

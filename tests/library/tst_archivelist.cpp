@@ -718,17 +718,17 @@ void tst_archivelist::selectionIsScrolledIntoView()
 void tst_archivelist::moveModeIgnoresTaps()
 {
     m_list->refreshArchiveList(threeTitles(QStringLiteral("move mode")));
-    QVERIFY(!m_list->isMoveMode());
+    QVERIFY(!m_list->itemsCanDrag());
     QSignalSpy drag(m_list.get(), &ArchiveList::signalItemsCanDrag);
     m_list->moveButtonClicked(true);
-    QVERIFY(m_list->isMoveMode());
+    QVERIFY(m_list->itemsCanDrag());
     m_canvas.clear();
     tap(1);
     QTest::mouseClick(item(1), Qt::RightButton, Qt::NoModifier, QPoint(20, 20));
     QVERIFY(m_canvas.isEmpty());
     QVERIFY(!m_list->IsOptionMenuShowing());
     m_list->moveButtonClicked(false);
-    QVERIFY(!m_list->isMoveMode());
+    QVERIFY(!m_list->itemsCanDrag());
     QCOMPARE(drag.count(), 2);
 }
 
