@@ -22,7 +22,7 @@ void TitleSelection::showSelected(ArchiveItem* item)
 {
     if (!item)
         return;
-    item->setStyleSheet(ArchiveItem::UN_OPERATE_AND_SELECT_STATE);
+    item->setLook(ArchiveItem::UN_OPERATE_AND_SELECT_STATE);
     item->setSelected(true);
 }
 
@@ -30,7 +30,7 @@ void TitleSelection::showDefault(ArchiveItem* item)
 {
     if (!item)
         return;
-    item->setStyleSheet(ArchiveItem::UN_OPERATE_AND_UN_SELECT_STATE);
+    item->setLook(ArchiveItem::UN_OPERATE_AND_UN_SELECT_STATE);
     item->setSelected(false);
 }
 
@@ -39,14 +39,14 @@ void TitleSelection::mark(ArchiveItem* item)
     if (!item)
         return;
     m_operation = HeldArchiveItem(item);
-    item->setStyleSheet(item == m_selected ? ArchiveItem::OPERATE_AND_SELECT_STATE
-                                           : ArchiveItem::OPERATE_AND_UN_SELECT_STATE);
+    item->setLook(item == m_selected ? ArchiveItem::OPERATE_AND_SELECT_STATE
+                                     : ArchiveItem::OPERATE_AND_UN_SELECT_STATE);
 }
 
 void TitleSelection::removeBorder(ArchiveItem* item) const
 {
     if (!item)
         return;
-    item->setStyleSheet(item == m_selected ? ArchiveItem::UN_OPERATE_AND_SELECT_STATE
-                                           : ArchiveItem::UN_OPERATE_AND_UN_SELECT_STATE);
+    item->setLook(item == m_selected ? ArchiveItem::UN_OPERATE_AND_SELECT_STATE
+                                     : ArchiveItem::UN_OPERATE_AND_UN_SELECT_STATE);
 }
