@@ -4,14 +4,17 @@
 #include "document/TText.h"
 #include "library/CheckeredPicture.h"
 #include "library/SmallPictures.h"
+#include "library/TitleLines.h"
 
-#include <QFontMetrics>
-#include <QLabel>
+#include <QColor>
+#include <QPainter>
 #include <QPixmap>
-#include <QTextLayout>
-#include <QTextOption>
-#include <QtMath>
+#include <QPixmapCache>
+#include <QStyle>
+#include <QStyleOption>
 #include <algorithm>
+#include <utility>
+#include <vector>
 
 const QSize ArchiveItem::PICTURE_SIZE(LEFT_CHILD_WIDTH, CHILD_HEIGHT);
 const QPoint ArchiveItem::LEFT_CHILD_POS(3, 2);
@@ -38,13 +41,67 @@ const int NARROW_PADDING_X = 12;
 const int NARROW_PADDING_TOP = 8;
 const int HANDLE_GAP = 6; // between the text and the handle for move mode
 
+TitleLines::Form listForm()
+{
+    TitleLines::Form form;
+    form.line = QSize(ArchiveItem::DISPLY_TEXT_SIZE_LENTH, ArchiveItem::LABEL_HEIGHT);
+    form.fontHeight = ArchiveItem::DISPLY_TEXT_SIZE;
+    form.text = QColor(220, 220, 220);
+    return form;
+}
+
+TitleLines::Form narrowForm()
+{
+    TitleLines::Form form;
+    form.line = QSize(NARROW_LABEL_WIDTH, NARROW_LABEL_HEIGHT);
+    form.top = NARROW_PADDING_TOP;
+    form.padding = NARROW_PADDING_X;
+    form.fontHeight = NARROW_LABEL_HEIGHT - 4;
+    form.text = QColor(178, 178, 178);
+    form.background = QColor(38, 38, 38);
+    return form;
+}
+
+// Draws on a sample item what the style sheet says.
+QPixmap drawLook(const QString& styleSheet, QSize size)
+{
+    QImage picture(size, QImage::Format_RGB32);
+    picture.fill(Qt::black);
+    ArchiveItem sample(nullptr, ArchiveItem::LIST_ITEM);
+    sample.setFixedSize(size);
+    sample.setStyleSheet(styleSheet);
+    QStyleOption option;
+    option.initFrom(&sample);
+    QPainter painter(&picture);
+    sample.style()->drawPrimitive(QStyle::PE_Widget, &option, &painter, &sample);
+    painter.end();
+    return QPixmap::fromImage(std::move(picture));
+}
+
+QPixmap lookPicture(const QString& styleSheet, QSize size)
+{
+    const QString key =
+        QStringLiteral("ArchiveItem %1x%2 ").arg(size.width()).arg(size.height()) + styleSheet;
+    QPixmap picture;
+    if (!QPixmapCache::find(key, &picture)) {
+        picture = drawLook(styleSheet, size);
+        QPixmapCache::insert(key, picture);
+    }
+    return picture;
+}
+
+static_assert(TitleLines::COUNT == ArchiveItem::LEFT_CHILD_LABEL_COUNT);
+
 } // namespace
 
 ArchiveItem::ArchiveItem(Archive* archive, int type, QWidget* parent)
-    : KSBaseItemWidget(parent), m_archive(archive), m_type(type)
+    : KSBaseItemWidget(Background::Own, parent)
+    , m_archive(archive)
+    , m_type(type)
+    , m_look(UN_OPERATE_AND_UN_SELECT_STATE)
 {
     setFixedSize(m_type == NARROW_ITEM ? RIGHT_CHILD_WIDTH : WIDGET_WIDTH, WIDGET_HEIGHT);
-    setStyleSheet(UN_OPERATE_AND_UN_SELECT_STATE);
+    setAttribute(Qt::WA_OpaquePaintEvent);
 }
 
 ArchiveItem::~ArchiveItem() = default;
@@ -97,11 +154,8 @@ void ArchiveItem::fitLinesToHandle()
     const bool hasHandle = hasDragFlag() && getDragFlagAlignment() == DRAGFLAG_RIGHT;
     const int width =
         hasHandle ? getHandlePos().x() - HANDLE_GAP - RIGHT_CHILD_POS.x() : DISPLY_TEXT_SIZE_LENTH;
-    if (m_labels.first()->width() == width)
-        return;
-    for (QLabel* label : m_labels)
-        label->setFixedWidth(width);
-    updateRightChild();
+    if (m_lines->lineWidth() != width)
+        m_lines->setLineWidth(width);
 }
 
 void ArchiveItem::createLeftChild()
@@ -115,29 +169,13 @@ void ArchiveItem::createLeftChild()
 
 void ArchiveItem::createRightChild()
 {
-    const bool narrow = m_type == NARROW_ITEM;
-    m_textWidget = new QWidget(this);
-    setChild(m_textWidget, CHILD_RIGHT);
-    m_textWidget->setObjectName(QStringLiteral("mTextWidget"));
-    if (narrow)
-        m_textWidget->setStyleSheet(QStringLiteral(" QWidget#mTextWidget { background:rgb(38, 38, 38); }"));
-    m_textWidget->setFixedSize(RIGHT_CHILD_WIDTH, CHILD_HEIGHT);
-    m_textWidget->move(narrow ? QPoint(0, RIGHT_CHILD_POS.y()) : RIGHT_CHILD_POS);
-
-    const QSize line =
-        narrow ? QSize(NARROW_LABEL_WIDTH, NARROW_LABEL_HEIGHT) : QSize(DISPLY_TEXT_SIZE_LENTH, LABEL_HEIGHT);
-    for (int i = 0; i < LEFT_CHILD_LABEL_COUNT; ++i) {
-        auto* label = new QLabel(m_textWidget);
-        label->setTextFormat(Qt::PlainText);
-        label->setStyleSheet(narrow ? QStringLiteral(" background: transparent; color:rgb(178, 178, 178);")
-                                    : QStringLiteral(" background: transparent; color:rgb(220, 220, 220);"));
-        label->setFixedSize(line);
-        if (narrow)
-            label->setContentsMargins(NARROW_PADDING_X, 0, NARROW_PADDING_X, 0);
-        label->move(0, (narrow ? NARROW_PADDING_TOP : 0) + i * line.height());
-        m_labels.append(label);
-    }
-    m_textWidget->show();
+    const bool isNarrow = m_type == NARROW_ITEM;
+    m_lines = new TitleLines(isNarrow ? narrowForm() : listForm(), this);
+    setChild(m_lines, CHILD_RIGHT);
+    m_lines->setObjectName(QStringLiteral("mTextWidget"));
+    m_lines->setFixedSize(RIGHT_CHILD_WIDTH, CHILD_HEIGHT);
+    m_lines->move(isNarrow ? QPoint(0, RIGHT_CHILD_POS.y()) : RIGHT_CHILD_POS);
+    m_lines->show();
 }
 
 void ArchiveItem::updateContents(QImage image)
@@ -158,82 +196,63 @@ void ArchiveItem::updateLeftChild(QImage image)
         image = SmallPictures::read(m_archive->getFullPathOfThumbnailSmall(), PICTURE_SIZE);
     else
         image = SmallPictures::fitted(image, PICTURE_SIZE);
-    m_picture->setPicture(image.isNull() ? QPixmap() : QPixmap::fromImage(image));
+    m_picture->setPicture(image);
 }
 
 void ArchiveItem::updateRightChild()
 {
-    if (!hasChildWidgets())
-        return;
-    QFont font(SYSTEM_FONT_FAMILY);
-    font.setPixelSize(m_type == NARROW_ITEM ? NARROW_LABEL_HEIGHT - 4 : DISPLY_TEXT_SIZE);
-    for (QLabel* label : m_labels) {
-        label->setFont(font);
-        label->clear();
-    }
-    setTextArea();
+    if (hasChildWidgets())
+        m_lines->setTexts(shownTexts(), SYSTEM_FONT_FAMILY);
 }
 
-// Aligns a line that is higher than its label at the bottom. Some families, including substitutes for missing
-// characters, have more space above and below than the label, and descenders must not be cut off.
-void ArchiveItem::placeLine(QLabel* label) const
-{
-    QTextLayout layout(label->text(), label->font());
-    layout.beginLayout();
-    const QTextLine line = layout.createLine();
-    layout.endLayout();
-    const bool fits = !line.isValid() || qCeil(line.height()) <= label->height();
-    label->setAlignment(Qt::AlignLeft | (fits ? Qt::AlignVCenter : Qt::AlignBottom));
-}
-
-void ArchiveItem::setTextArea()
+// Returns the texts in the order of their numbers.
+QStringList ArchiveItem::shownTexts() const
 {
     if (!m_archive)
-        return;
-    const std::vector<TText*>& texts = m_archive->text();
-    if (texts.size() == 1)
-        setOneTextArea(QString::fromStdString(texts.front()->getText()));
-    else if (texts.size() > 1)
-        setManyTextArea();
-}
-
-// Breaks the text between words into the lines; the last line takes the rest and is elided.
-void ArchiveItem::setOneTextArea(const QString& text)
-{
-    const QString words = text.simplified();
-    QTextLayout layout(words, m_labels.first()->font());
-    QTextOption wrapping;
-    wrapping.setWrapMode(QTextOption::WrapAtWordBoundaryOrAnywhere);
-    layout.setTextOption(wrapping);
-    layout.beginLayout();
-    for (QLabel* label : m_labels) {
-        QTextLine line = layout.createLine();
-        if (!line.isValid())
-            break;
-        line.setLineWidth(label->contentsRect().width());
-        const bool isLast = label == m_labels.last();
-        setLabelText(words.mid(line.textStart(), isLast ? -1 : line.textLength()).trimmed(), label);
-    }
-    layout.endLayout();
-}
-
-void ArchiveItem::setManyTextArea()
-{
-    std::vector<TText*> texts = m_archive->getText();
+        return {};
+    std::vector<TText*> texts = m_archive->text();
     std::stable_sort(texts.begin(), texts.end(), [](const TText* left, const TText* right) {
         return left->getTextObjectID() < right->getTextObjectID();
     });
-    const qsizetype lines = std::min<qsizetype>(m_labels.size(), static_cast<qsizetype>(texts.size()));
-    for (qsizetype i = 0; i < lines; ++i)
-        setLabelText(QString::fromStdString(texts[static_cast<size_t>(i)]->getText()).simplified(),
-                     m_labels.at(i));
+    QStringList shown;
+    for (const TText* text : texts)
+        shown.append(QString::fromStdString(text->getText()));
+    return shown;
 }
 
-void ArchiveItem::setLabelText(const QString& text, QLabel* label)
+// --- Looks ----------------------------------------------------------------------------------------------
+
+void ArchiveItem::setLook(const QString& styleSheet)
 {
-    const int room = label->contentsRect().width();
-    label->setText(QFontMetrics(label->font()).elidedText(text, Qt::ElideRight, room));
-    placeLine(label);
+    if (m_look == styleSheet)
+        return;
+    m_look = styleSheet;
+    m_background = QPixmap();
+    update();
+}
+
+void ArchiveItem::setSelectedStyle()
+{
+    setLook(UN_OPERATE_AND_SELECT_STATE);
+}
+
+void ArchiveItem::setNormalStyle()
+{
+    setLook(UN_OPERATE_AND_UN_SELECT_STATE);
+}
+
+// The pictures of a lifted item have transparent corners.
+void ArchiveItem::setPopup(bool popup)
+{
+    setAttribute(Qt::WA_OpaquePaintEvent, !popup);
+    KSBaseItemWidget::setPopup(popup);
+}
+
+void ArchiveItem::paintBackground(QPainter& painter, const QRect& exposed)
+{
+    if (m_background.size() != size())
+        m_background = lookPicture(m_look, size());
+    painter.drawPixmap(exposed.topLeft(), m_background, exposed);
 }
 
 ArchiveItem* ArchiveItem::clone()
@@ -245,7 +264,7 @@ ArchiveItem* ArchiveItem::clone()
     if (m_picture && item->m_picture)
         item->m_picture->setPicture(m_picture->picture()); // the picture may be newer than the file
     item->setSelected(isSelected());
-    item->setStyleSheet(isSelected() ? OPERATE_AND_SELECT_STATE : OPERATE_AND_UN_SELECT_STATE);
+    item->setLook(isSelected() ? OPERATE_AND_SELECT_STATE : OPERATE_AND_UN_SELECT_STATE);
     return item;
 }
 

@@ -3,14 +3,16 @@
 #include "touchui/KSBaseItemWidget.h"
 
 #include <QImage>
-#include <QList>
+#include <QPixmap>
 #include <QPoint>
+#include <QSize>
 #include <QString>
+#include <QStringList>
 #include <memory>
 
 class Archive;
 class CheckeredPicture;
-class QLabel;
+class TitleLines;
 
 // One title in the list: its thumbnail on a checker pattern, and the first lines of its texts.
 class ArchiveItem : public KSBaseItemWidget
@@ -31,7 +33,8 @@ public:
     static const QPoint LEFT_CHILD_POS;
     static const QPoint RIGHT_CHILD_POS;
 
-    // Style sheets: the border marks the item that the menu acts on, the gradient the title on the canvas.
+    // Looks, as style sheets: the border marks the item that the menu acts on, the gradient the title on the
+    // canvas.
     static const QString OPERATE_AND_SELECT_STATE;
     static const QString OPERATE_AND_UN_SELECT_STATE;
     static const QString UN_OPERATE_AND_SELECT_STATE;
@@ -53,6 +56,14 @@ public:
     // Copies the contents of the given record, but keeps the name in the item's record.
     void updateArchiveData(Archive* archive);
 
+    // Sets the look, which is one of the style sheets above. Each is drawn once for all items: a style sheet
+    // of its own would cost an item more than its contents.
+    void setLook(const QString& styleSheet);
+    const QString& look() const { return m_look; }
+    void setSelectedStyle() override;
+    void setNormalStyle() override;
+    void setPopup(bool popup) override;
+
     // Prevents the list from giving the item back; see HeldArchiveItem.
     void hold() { ++m_holds; }
     void letGo() { --m_holds; }
@@ -61,7 +72,7 @@ public:
     // Builds the thumbnail and the text lines. Reads the picture file when no picture is given, so the list
     // calls it only for items on screen.
     void initArchiveItemChildWidget(const QImage& picture = QImage());
-    bool hasChildWidgets() const { return m_textWidget != nullptr; }
+    bool hasChildWidgets() const { return m_lines != nullptr; }
 
     void updateContents(QImage image);
     // Shows the image; for a null image the title's small picture from its file, or only the checker pattern
@@ -79,21 +90,21 @@ public:
     static void setSystemFontFamily(QString family);
     static QString SYSTEM_FONT_FAMILY;
 
+protected:
+    void paintBackground(QPainter& painter, const QRect& exposed) override;
+
 private:
     void createLeftChild();
     void createRightChild();
     void fitLinesToHandle();
-    void placeLine(QLabel* label) const;
-    void setTextArea();
-    void setOneTextArea(const QString& text);
-    void setManyTextArea();
-    void setLabelText(const QString& text, QLabel* label);
+    QStringList shownTexts() const;
 
     Archive* m_archive;
     std::unique_ptr<Archive> m_ownArchive; // set in clones only
     int m_type;
     int m_holds = 0;
     CheckeredPicture* m_picture = nullptr;
-    QWidget* m_textWidget = nullptr;
-    QList<QLabel*> m_labels;
+    TitleLines* m_lines = nullptr;
+    QString m_look;
+    QPixmap m_background; // of the look, shared by all items; null until it is painted
 };

@@ -1,24 +1,22 @@
 #pragma once
 
 #include "document/Archive.h"
-#include "library/ArchiveItems.h"
+#include "library/HeldArchiveItem.h"
+#include "library/ListedFolder.h"
+#include "library/ListedTitles.h"
+#include "library/TitleLoader.h"
 #include "library/TitleMenuActions.h"
-#include "library/TitleRows.h"
 #include "library/TitleSelection.h"
 #include "touchui/KSScrollViewerWidget.h"
 
 #include <QImage>
 #include <QList>
-#include <QPointer>
 #include <QString>
 #include <memory>
-#include <utility>
 
 class ArchiveController;
-class ArchiveInitThread;
 class ArchiveItem;
 class ArchiveOrder;
-class ArchiveRow;
 class CanvasScene;
 class QAction;
 class QLabel;
@@ -38,14 +36,13 @@ class ArchiveList : public KSScrollViewerWidget
 public:
     static const int LIMIT_REMAIN = 200; // with KB_MILLION: kilobytes that must stay free on the disk
     static const int KB_MILLION = 1000;
-    static const int MENU_FONT_SIZE = 28; // pixels
 
     // The label shows the name of the folder; it is not owned and must outlive the list. With autoInit the
     // last folder used, or otherwise the first one, is opened at once.
     ArchiveList(QLabel* folderLabel, bool autoInit, QWidget* parent = nullptr);
     ~ArchiveList() override;
 
-    QString getCurrentPath() const { return m_currentPath; }
+    QString getCurrentPath() const { return m_folder.path(); }
     ArchiveItem* getCurrentOperationArchive() const { return m_selection.operation(); }
     ArchiveItem* getSelectedArchive() const { return m_selection.selected(); }
     bool IsOptionMenuShowing() const { return m_actions->isMenuShowing(); }
@@ -53,10 +50,9 @@ public:
     // Returns the item, or null for an index out of range. Items are made when they scroll into view or when
     // they are requested here, and may be given back when a long folder is scrolled on; use HeldArchiveItem
     // to keep one.
-    ArchiveItem* archiveItem(int index) const;
+    ArchiveItem* archiveItem(int index) const { return m_titles.item(index); }
     // Returns the full path of the title file without making an item. Empty for an index out of range.
-    QString titlePath(int index) const;
-    bool isMoveMode() const { return m_moveMode; }
+    QString titlePath(int index) const { return m_titles.path(index); }
     // Returns whether an item is being dragged.
     bool getMoveState() const { return m_moving; }
 
@@ -86,15 +82,12 @@ public:
     void translateText();
 
     // Makes an item without child widgets, which are created when it is on screen. The list is its parent.
-    ArchiveItem* createBaseItem(Archive* archive) { return m_items.make(archive); }
+    ArchiveItem* createBaseItem(Archive* archive) { return m_titles.makeItem(archive); }
     // Returns the given item or, for null, a new one of the record, complete with child widgets.
     ArchiveItem* createPasteUndoItem(Archive* archive, ArchiveItem* item);
 
-    // Makes the item of a row of this list, with its record. Called by the row.
-    ArchiveItem* makeItem(ArchiveRow& row);
-
     // Returns the index and file name of each item; the caller owns the entries.
-    QList<ArchiveOrder*> getArchiveOrderList() const;
+    QList<ArchiveOrder*> getArchiveOrderList() const { return m_titles.order(); }
     // Saves the order. If the disk refuses it, it is kept and written later.
     void saveArchiveListOrder();
 
@@ -103,15 +96,8 @@ public:
 
     // Returns whether the folder has as many titles as allowed. For a long folder it waits for the check when
     // the result depends on it.
-    bool checkArchiveListIsFull();
+    bool checkArchiveListIsFull() { return m_titles.isFull(); }
     bool checkDiskSpaceIsFull() const;
-    // Waits for a running check of the titles. Call before the list is changed, since the check still changes
-    // the rows.
-    void finishCheck();
-    // Keeps the record for an item that is about to be made.
-    Archive* own(std::unique_ptr<Archive> record) { return m_items.own(std::move(record)); }
-    // Blocks until the pictures of the selected title are written.
-    void waitForCanvas();
 
 Q_SIGNALS:
     // Sends a title to the canvas; null when there is none to show. The list keeps owning the record.
@@ -162,54 +148,29 @@ public Q_SLOTS:
     void getArchiveListSuccessed(QList<Archive*> archivesList);
     void moveCurrentArchiveItemVisble();
     // Sets the canvas, which is not owned.
-    void setMainScene(CanvasScene* mainScene) { m_mainScene = mainScene; }
+    void setMainScene(CanvasScene* mainScene);
     void wheelEvent(QWheelEvent* event) override;
 
 private:
     void initArchiveListConnect();
-    void connectMenuActions();
-    void setMenuFont(const QString& family);
     void initArchiveListData();
     void initArchiveListRefreshData();
-    void endInitThread();
     void openFolder(const QString& path);
     void clearOldArchiveList();
-    void beginCheck();
-    void removeUnreadable();
-    void requestContents();
-    void giveBackItems();
-    ArchiveRow* archiveRow(int index) const;
-    ArchiveItem* madeItem(int index) const;
-    ArchiveItem* readableItem(int index);
-    int findTitle(const QString& path) const;
     // Selects the title. Returns false when it does not exist or its file cannot be read.
     bool selectTitle(const QString& path);
-    void resetPositions();
-    void setFolderLabel();
-    void prepareOrder();
-    bool orderIsDamaged() const;
-    void offerTemplateOrReportFull();
-    ArchiveItem* findItem(const QString& path) const;
 
     std::unique_ptr<ArchiveController> m_controller;
-    std::unique_ptr<ArchiveInitThread> m_initThread;
-    bool m_ignoreLoaded = false; // set while a loader is being ended, which may still deliver titles
-    TitleRows m_rows;
-    ArchiveItems m_items;
-    bool m_contentsRequested = false;
-    bool m_giveBackRequested = false;
+    ListedFolder m_folder;
+    ListedTitles m_titles;
     std::unique_ptr<TitleMenuActions> m_actions;
     QLabel* m_folderLabel;
     CanvasScene* m_mainScene = nullptr;
-    // Whether unlisted title files of the folder may be removed. Withheld when the order could not be read or
-    // written, until the folder is opened again.
-    enum class CleanUp { Allowed, Withheld };
-    CleanUp m_cleanUp = CleanUp::Withheld;
-    QString m_currentPath;
     TitleSelection m_selection;
-    QPointer<ArchiveItem> m_draggedItem;
+    HeldArchiveItem m_draggedItem;
     int m_moveSource = -1;   // row of the dragged item
     bool m_moveMode = false; // whether titles can be dragged
     bool m_moving = false;
     bool m_longHold = false; // set by a long press: the release that follows must not select
+    TitleLoader m_loader;    // declared last, so that it ends before what takes its titles
 };

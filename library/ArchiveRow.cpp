@@ -3,13 +3,13 @@
 #include "document/Archive.h"
 #include "document/FolderTitles.h"
 #include "library/ArchiveItem.h"
-#include "library/ArchiveList.h"
+#include "library/ListedTitles.h"
 
 #include <utility>
 
-ArchiveRow::ArchiveRow(ArchiveList& list, std::shared_ptr<const FolderTitles> titles, std::size_t number,
+ArchiveRow::ArchiveRow(ListedTitles& owner, std::shared_ptr<const FolderTitles> titles, std::size_t number,
                        std::unique_ptr<Archive> record)
-    : m_list(list)
+    : m_owner(owner)
     , m_titles(std::move(titles))
     , m_number(number)
     , m_path(m_titles->path(number))
@@ -17,8 +17,8 @@ ArchiveRow::ArchiveRow(ArchiveList& list, std::shared_ptr<const FolderTitles> ti
 {
 }
 
-ArchiveRow::ArchiveRow(ArchiveList& list, std::unique_ptr<Archive> record)
-    : m_list(list), m_path(record->getPath()), m_record(std::move(record))
+ArchiveRow::ArchiveRow(ListedTitles& owner, std::unique_ptr<Archive> record)
+    : m_owner(owner), m_path(record->getPath()), m_record(std::move(record))
 {
 }
 
@@ -31,7 +31,7 @@ QSize ArchiveRow::size() const
 
 KSBaseItemWidget* ArchiveRow::makeWidget()
 {
-    return m_list.makeItem(*this);
+    return m_owner.makeItem(*this);
 }
 
 std::unique_ptr<Archive> ArchiveRow::takeRecord()

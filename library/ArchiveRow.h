@@ -7,8 +7,8 @@
 #include <string>
 
 class Archive;
-class ArchiveList;
 class FolderTitles;
+class ListedTitles;
 
 // A title as a row of the list. The list has a row for each title of a folder; the item and its record are
 // made when the row scrolls into view. GUI thread only.
@@ -16,11 +16,11 @@ class ArchiveRow : public ScrollViewerRow
 {
 public:
     // Makes a row for a title whose file is read when the record is needed. number is its index in the
-    // titles; record may be null. The list must outlive the row.
-    ArchiveRow(ArchiveList& list, std::shared_ptr<const FolderTitles> titles, std::size_t number,
+    // titles; record may be null. The owner, which makes the item, must outlive the row.
+    ArchiveRow(ListedTitles& owner, std::shared_ptr<const FolderTitles> titles, std::size_t number,
                std::unique_ptr<Archive> record);
     // Makes a row for a title that exists as a record only.
-    ArchiveRow(ArchiveList& list, std::unique_ptr<Archive> record);
+    ArchiveRow(ListedTitles& owner, std::unique_ptr<Archive> record);
     ~ArchiveRow() override;
 
     QSize size() const override;
@@ -39,7 +39,7 @@ public:
     bool isUnreadable() const { return m_isUnreadable; }
 
 private:
-    ArchiveList& m_list;
+    ListedTitles& m_owner;
     std::shared_ptr<const FolderTitles> m_titles;
     std::size_t m_number = 0;
     std::string m_path;

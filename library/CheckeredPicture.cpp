@@ -2,7 +2,9 @@
 
 #include <QBrush>
 #include <QPainter>
+#include <QPixmap>
 #include <QPixmapCache>
+#include <utility>
 
 namespace
 {
@@ -42,17 +44,27 @@ CheckeredPicture::CheckeredPicture(QWidget* parent) : QWidget(parent)
     setAttribute(Qt::WA_OpaquePaintEvent);
 }
 
-void CheckeredPicture::setPicture(const QPixmap& picture)
+void CheckeredPicture::setPicture(const QImage& picture)
 {
     m_picture = picture;
+    m_isPrepared = picture.isNull();
     update();
+}
+
+// Converts the picture to the format that is painted fastest: that of a pixmap, which is opaque if the
+// picture is.
+void CheckeredPicture::prepare()
+{
+    if (!std::exchange(m_isPrepared, true))
+        m_picture = QPixmap::fromImage(std::move(m_picture)).toImage();
 }
 
 void CheckeredPicture::paintEvent(QPaintEvent*)
 {
+    prepare();
     QPainter painter(this);
     const bool isCovered = !m_picture.hasAlphaChannel() && m_picture.rect().contains(rect());
     if (!isCovered)
         painter.fillRect(rect(), checkerBrush());
-    painter.drawPixmap(0, 0, m_picture);
+    painter.drawImage(0, 0, m_picture);
 }

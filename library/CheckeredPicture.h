@@ -1,6 +1,6 @@
 #pragma once
 
-#include <QPixmap>
+#include <QImage>
 #include <QWidget>
 
 // Shows a picture in its upper left corner, over a checker pattern where the picture is transparent or does
@@ -13,12 +13,15 @@ public:
     explicit CheckeredPicture(QWidget* parent = nullptr);
 
     // Null for the pattern alone.
-    void setPicture(const QPixmap& picture);
-    const QPixmap& picture() const { return m_picture; }
+    void setPicture(const QImage& picture);
+    const QImage& picture() const { return m_picture; }
 
 protected:
     void paintEvent(QPaintEvent* event) override;
 
 private:
-    QPixmap m_picture;
+    void prepare();
+
+    QImage m_picture;
+    bool m_isPrepared = true; // for painting
 };

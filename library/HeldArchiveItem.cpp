@@ -23,6 +23,16 @@ HeldArchiveItem::~HeldArchiveItem()
     hold(nullptr);
 }
 
+HeldArchiveItem::operator ArchiveItem*() const
+{
+    return m_item;
+}
+
+ArchiveItem* HeldArchiveItem::operator->() const
+{
+    return m_item;
+}
+
 void HeldArchiveItem::hold(ArchiveItem* item)
 {
     if (item)

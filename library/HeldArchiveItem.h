@@ -4,18 +4,20 @@
 
 class ArchiveItem;
 
-// A title's item that an undo command needs later: while it is held, the list does not give it back. Null
-// after the list was emptied. GUI thread only.
+// A title's item that is needed later: while it is held, the list does not give it back. Null after the list
+// was emptied. GUI thread only.
 class HeldArchiveItem
 {
 public:
+    HeldArchiveItem() = default;
     explicit HeldArchiveItem(ArchiveItem* item);
     HeldArchiveItem(const HeldArchiveItem& other);
     HeldArchiveItem& operator=(const HeldArchiveItem& other);
     ~HeldArchiveItem();
 
-    operator ArchiveItem*() const { return m_item; }
-    ArchiveItem* operator->() const { return m_item; }
+    operator ArchiveItem*() const;
+    ArchiveItem* operator->() const;
+    void clear() { hold(nullptr); }
 
 private:
     void hold(ArchiveItem* item);

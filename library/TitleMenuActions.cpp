@@ -1,5 +1,6 @@
 #include "library/TitleMenuActions.h"
 
+#include "canvas/CanvasScene.h"
 #include "document/Archive.h"
 #include "document/ArchiveController.h"
 #include "library/ArchiveItem.h"
@@ -8,15 +9,16 @@
 #include "library/DeleteArchiveCommand.h"
 #include "library/IEditContext.h"
 #include "library/ListMessages.h"
+#include "library/ListedTitles.h"
 #include "library/PasteArchiveCommand.h"
 #include "library/TitleReports.h"
+#include "library/TitleSelection.h"
 #include "support/FolderLookup.h"
 #include "support/IPathManagerEx.h"
 #include "support/LogManager.h"
 #include "touchui/ITitlerAPPEventFilterController.h"
 
 #include <QFileInfo>
-#include <algorithm>
 #include <string>
 #include <utility>
 
@@ -42,9 +44,10 @@ std::wstring logText(ArchiveAction::ARCHIVE_ACTION_TYPE type)
 
 } // namespace
 
-TitleMenuActions::TitleMenuActions(ArchiveList* list, ArchiveController& controller)
-    : m_list(list), m_controller(controller), m_files(controller)
+TitleMenuActions::TitleMenuActions(ArchiveList* list, ListedTitles& titles, ArchiveController& controller)
+    : m_list(list), m_titles(titles), m_controller(controller), m_files(controller)
 {
+    setMenuFont(QStringLiteral("KST"));
 }
 
 TitleMenuActions::~TitleMenuActions() = default;
@@ -83,6 +86,12 @@ void TitleMenuActions::showOptionMenu(ArchiveItem* item, const QPoint& pos, QWid
     Q_EMIT archiveListMenuShow();
 }
 
+void TitleMenuActions::setMenuFont(const QString& family)
+{
+    m_menuFont = QFont(family);
+    m_menuFont.setPixelSize(MENU_FONT_SIZE);
+}
+
 void TitleMenuActions::sendTitlerAppEvent(bool open)
 {
     if (!m_eventController) {
@@ -114,8 +123,7 @@ void TitleMenuActions::translateText()
 
 void TitleMenuActions::rowsRemoved(const QList<int>& rows)
 {
-    m_operationPosition -=
-        static_cast<int>(std::lower_bound(rows.cbegin(), rows.cend(), m_operationPosition) - rows.cbegin());
+    m_operationPosition = ListedTitles::rowAfterRemoval(m_operationPosition, rows);
 }
 
 // --- What its entries do --------------------------------------------------------------------------------
@@ -180,9 +188,9 @@ void TitleMenuActions::createArchiveFromTemplate(Archive* temp)
 
 void TitleMenuActions::emitPasteCommand(std::unique_ptr<Archive> archive)
 {
-    m_list->finishCheck();
+    m_titles.finishCheck();
     const int selected = m_list->getItemIndex(m_list->getSelectedArchive());
-    Archive* record = m_list->own(std::move(archive));
+    Archive* record = m_titles.own(std::move(archive));
     Q_EMIT pasteCommandSignal(new PasteArchiveCommand(m_list, record, m_operationPosition, selected));
 }
 
@@ -224,7 +232,7 @@ void TitleMenuActions::exeDeleteArchive()
     if (!item)
         return;
     m_list->clearOperationItemState(item);
-    m_list->finishCheck();
+    m_titles.finishCheck();
     // The check may have removed the title.
     item = m_list->getCurrentOperationArchive();
     const int position = m_list->getItemIndex(item);
@@ -233,6 +241,17 @@ void TitleMenuActions::exeDeleteArchive()
     m_operationPosition = position;
     Q_EMIT deleteCommandSignal(
         new DeleteArchiveCommand(m_list, item, position, item == m_list->getSelectedArchive()));
+}
+
+// Blocks until the pictures of the selected title are written. The canvas makes them when the title is
+// deselected, so that is done for a moment. This is not a selection by the operator: nothing is logged and
+// the list does not scroll.
+void TitleMenuActions::waitForCanvas()
+{
+    m_list->setDefaultItemState(m_list->getSelectedArchive());
+    if (m_scene)
+        m_scene->waitForPictures();
+    TitleSelection::showSelected(m_list->getSelectedArchive());
 }
 
 void TitleMenuActions::exeAddUserArchive()
@@ -254,7 +273,7 @@ void TitleMenuActions::exeAddUserArchive()
         return;
     }
     if (item == m_list->getSelectedArchive())
-        m_list->waitForCanvas();
+        waitForCanvas();
     const Archive source(*item->getArchiveData());
     const std::unique_ptr<Archive> target = m_files.createUserTemplate(root, name, source);
     if (!target) {

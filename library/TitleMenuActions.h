@@ -15,7 +15,9 @@ class ArchiveController;
 class ArchiveItem;
 class ArchiveList;
 class ArchiveMenu;
+class CanvasScene;
 class ITitlerAPPEventFilterController;
+class ListedTitles;
 class QAction;
 class QPoint;
 class QUndoCommand;
@@ -27,8 +29,10 @@ class TitleMenuActions : public QObject
     Q_OBJECT
 
 public:
-    // Neither is owned, and both must outlive this object.
-    TitleMenuActions(ArchiveList* list, ArchiveController& controller);
+    static const int MENU_FONT_SIZE = 28; // pixels
+
+    // The titles are those of the list. None of them is owned, and all must outlive this object.
+    TitleMenuActions(ArchiveList* list, ListedTitles& titles, ArchiveController& controller);
     ~TitleMenuActions() override;
 
     // Opens the menu for a title, or with null for the empty area after the last one. pos is in coordinates
@@ -38,10 +42,12 @@ public:
     void hideMenu();
     // Reports to the sibling processes whether a popup is open: a press in one of them closes it.
     void sendTitlerAppEvent(bool open);
-    void setMenuFont(const QFont& font) { m_menuFont = font; }
+    void setMenuFont(const QString& family);
     void translateText();
 
     void selectOptionMenuItem(QAction* action);
+    // Sets the canvas, which is not owned; it makes the pictures of the selected title.
+    void setMainScene(CanvasScene* scene) { m_scene = scene; }
     // See ArchiveList::createArchiveFromTemplate().
     void createArchiveFromTemplate(Archive* temp);
     void clearCopyArchive() { m_clipboard.clear(); }
@@ -70,8 +76,11 @@ private:
     void exeDeleteArchive();
     void exeAddUserArchive();
     void emitPasteCommand(std::unique_ptr<Archive> archive);
+    void waitForCanvas();
 
     ArchiveList* m_list;
+    ListedTitles& m_titles;
+    CanvasScene* m_scene = nullptr;
     ArchiveController& m_controller;
     TitleFileOperations m_files;
     TitleClipboard m_clipboard;

@@ -20,7 +20,7 @@ constexpr std::size_t AT_ONCE = ListMessages::TITLE_LIMIT;
 TitleRows::TitleRows() = default;
 TitleRows::~TitleRows() = default;
 
-std::vector<std::unique_ptr<ScrollViewerRow>> TitleRows::read(ArchiveList& list, const QString& folder)
+std::vector<std::unique_ptr<ScrollViewerRow>> TitleRows::read(ListedTitles& owner, const QString& folder)
 {
     const auto titles =
         std::make_shared<const FolderTitles>(folder.toStdString(), FolderTitles::WithoutOrder::ByName);
@@ -31,13 +31,13 @@ std::vector<std::unique_ptr<ScrollViewerRow>> TitleRows::read(ArchiveList& list,
         const std::size_t end = std::min(next + AT_ONCE, titles->count());
         for (std::unique_ptr<Archive>& record : titles->read(next, end - next)) {
             if (record)
-                rows.push_back(std::make_unique<ArchiveRow>(list, titles, next, std::move(record)));
+                rows.push_back(std::make_unique<ArchiveRow>(owner, titles, next, std::move(record)));
             ++next;
         }
     }
     m_readAtOnce = static_cast<int>(rows.size());
     for (std::size_t number = next; number < titles->count(); ++number)
-        rows.push_back(std::make_unique<ArchiveRow>(list, titles, number, nullptr));
+        rows.push_back(std::make_unique<ArchiveRow>(owner, titles, number, nullptr));
     if (next < titles->count()) {
         m_check = std::make_unique<ArchiveCheckThread>(titles, next);
         connect(m_check.get(), &ArchiveCheckThread::unreadableFound, this, &TitleRows::unreadableFound,

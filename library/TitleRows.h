@@ -8,7 +8,7 @@
 #include <vector>
 
 class ArchiveCheckThread;
-class ArchiveList;
+class ListedTitles;
 class ScrollViewerRow;
 
 // Makes the rows of a folder for the title list. Whether a file is a title depends on its contents: the files
@@ -21,9 +21,10 @@ public:
     TitleRows();
     ~TitleRows() override;
 
-    // Reads the folder in its order. Checks files until at least one title is found, if there is any.
+    // Reads the folder in its order, as rows of the owner. Checks files until at least one title is found, if
+    // there is any.
     // beginCheck() starts the check of the others; a running check of the previous folder is ended.
-    std::vector<std::unique_ptr<ScrollViewerRow>> read(ArchiveList& list, const QString& folder);
+    std::vector<std::unique_ptr<ScrollViewerRow>> read(ListedTitles& owner, const QString& folder);
     // Returns how many rows were found to be titles when the folder was read.
     int readAtOnce() const { return m_readAtOnce; }
 

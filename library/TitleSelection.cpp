@@ -15,14 +15,14 @@ ArchiveItem* TitleSelection::operation() const
 void TitleSelection::select(ArchiveItem* item)
 {
     if (item)
-        m_selected = item;
+        m_selected = HeldArchiveItem(item);
 }
 
 void TitleSelection::showSelected(ArchiveItem* item)
 {
     if (!item)
         return;
-    item->setStyleSheet(ArchiveItem::UN_OPERATE_AND_SELECT_STATE);
+    item->setLook(ArchiveItem::UN_OPERATE_AND_SELECT_STATE);
     item->setSelected(true);
 }
 
@@ -30,7 +30,7 @@ void TitleSelection::showDefault(ArchiveItem* item)
 {
     if (!item)
         return;
-    item->setStyleSheet(ArchiveItem::UN_OPERATE_AND_UN_SELECT_STATE);
+    item->setLook(ArchiveItem::UN_OPERATE_AND_UN_SELECT_STATE);
     item->setSelected(false);
 }
 
@@ -38,15 +38,15 @@ void TitleSelection::mark(ArchiveItem* item)
 {
     if (!item)
         return;
-    m_operation = item;
-    item->setStyleSheet(item == m_selected ? ArchiveItem::OPERATE_AND_SELECT_STATE
-                                           : ArchiveItem::OPERATE_AND_UN_SELECT_STATE);
+    m_operation = HeldArchiveItem(item);
+    item->setLook(item == m_selected ? ArchiveItem::OPERATE_AND_SELECT_STATE
+                                     : ArchiveItem::OPERATE_AND_UN_SELECT_STATE);
 }
 
 void TitleSelection::removeBorder(ArchiveItem* item) const
 {
     if (!item)
         return;
-    item->setStyleSheet(item == m_selected ? ArchiveItem::UN_OPERATE_AND_SELECT_STATE
-                                           : ArchiveItem::UN_OPERATE_AND_UN_SELECT_STATE);
+    item->setLook(item == m_selected ? ArchiveItem::UN_OPERATE_AND_SELECT_STATE
+                                     : ArchiveItem::UN_OPERATE_AND_UN_SELECT_STATE);
 }

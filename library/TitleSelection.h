@@ -1,6 +1,6 @@
 #pragma once
 
-#include <QPointer>
+#include "library/HeldArchiveItem.h"
 
 class ArchiveItem;
 
@@ -26,6 +26,6 @@ public:
     void forgetOperation() { m_operation.clear(); }
 
 private:
-    QPointer<ArchiveItem> m_selected;
-    QPointer<ArchiveItem> m_operation;
+    HeldArchiveItem m_selected;
+    HeldArchiveItem m_operation;
 };

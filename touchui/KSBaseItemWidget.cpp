@@ -6,6 +6,7 @@
 #include <QGraphicsDropShadowEffect>
 #include <QHBoxLayout>
 #include <QLabel>
+#include <QPaintEvent>
 #include <QPainter>
 #include <QPixmap>
 #include <QPointerEvent>
@@ -28,16 +29,15 @@ QPoint pressPosition(const QEvent* event)
 
 } // namespace
 
-KSBaseItemWidget::KSBaseItemWidget(QWidget* parent)
-    : KSPushbutton(parent), m_shadow(new QGraphicsDropShadowEffect(this))
+KSBaseItemWidget::KSBaseItemWidget(QWidget* parent) : KSBaseItemWidget(Background::StyleSheet, parent)
 {
-    KSBaseItemWidget::setNormalStyle();
+}
+
+KSBaseItemWidget::KSBaseItemWidget(Background background, QWidget* parent) : KSPushbutton(parent)
+{
     setFocusPolicy(Qt::NoFocus);
-    m_shadow->setBlurRadius(15.0);
-    m_shadow->setColor(QColor(0, 0, 0, 255));
-    m_shadow->setOffset(0, 0);
-    m_shadow->setEnabled(false);
-    setGraphicsEffect(m_shadow);
+    if (background == Background::StyleSheet)
+        KSBaseItemWidget::setNormalStyle();
 }
 
 // Created when it is first needed, because most rows are never dragged.
@@ -154,7 +154,7 @@ void KSBaseItemWidget::setNormalStyle()
 
 void KSBaseItemWidget::setPopup(bool popup)
 {
-    m_shadow->setEnabled(popup);
+    showShadow(popup);
     m_popup = popup;
     if (popup && m_dragBase.front().isNull())
         loadDragBase();
@@ -163,6 +163,20 @@ void KSBaseItemWidget::setPopup(bool popup)
         m_handle->setVisible(m_dragFlag && !popup);
     updateDragArea();
     update();
+}
+
+// The effect exists only while it is shown, since Qt paints all that lies behind a widget with an effect.
+void KSBaseItemWidget::showShadow(bool show)
+{
+    if (!show) {
+        setGraphicsEffect(nullptr);
+        return;
+    }
+    auto* shadow = new QGraphicsDropShadowEffect(this);
+    shadow->setBlurRadius(15.0);
+    shadow->setColor(QColor(0, 0, 0, 255));
+    shadow->setOffset(0, 0);
+    setGraphicsEffect(shadow);
 }
 
 void KSBaseItemWidget::setSpace(int between, int around)
@@ -295,18 +309,22 @@ void KSBaseItemWidget::resizeEvent(QResizeEvent* event)
     Q_EMIT signalResize();
 }
 
-void KSBaseItemWidget::paintEvent(QPaintEvent*)
+void KSBaseItemWidget::paintEvent(QPaintEvent* event)
 {
     QPainter painter(this);
-    if (m_popup) {
+    if (m_popup)
         paintDragBase(painter);
-    } else {
-        // Paint only the background of the style sheet; as a button, the item would also get a bevel.
-        QStyleOption option;
-        option.initFrom(this);
-        style()->drawPrimitive(QStyle::PE_Widget, &option, &painter, this);
-    }
+    else
+        paintBackground(painter, event->rect());
     paintDragFlag(painter);
+}
+
+// Paints only the background of the style sheet; as a button, the item would also get a bevel.
+void KSBaseItemWidget::paintBackground(QPainter& painter, const QRect&)
+{
+    QStyleOption option;
+    option.initFrom(this);
+    style()->drawPrimitive(QStyle::PE_Widget, &option, &painter, this);
 }
 
 void KSBaseItemWidget::loadDragBase()

@@ -8,7 +8,6 @@
 #include <QSize>
 #include <array>
 
-class QGraphicsDropShadowEffect;
 class QHBoxLayout;
 class QLabel;
 class QPainter;
@@ -70,9 +69,16 @@ Q_SIGNALS:
     void signalStartMove(KSBaseItemWidget* item);
 
 protected:
+    // How the background is painted: from the style sheets of setSelectedStyle() and setNormalStyle(), or by
+    // a subclass that sets no style sheet.
+    enum class Background { StyleSheet, Own };
+    KSBaseItemWidget(Background background, QWidget* parent);
+
     bool event(QEvent* event) override;
     void paintEvent(QPaintEvent* event) override;
     void resizeEvent(QResizeEvent* event) override;
+    // Paints what lies below the children of an item that is not lifted, at least within exposed.
+    virtual void paintBackground(QPainter& painter, const QRect& exposed);
     QPoint getHandlePos() const;
     void paintDragBase(QPainter& painter);
     void paintDragFlag(QPainter& painter);
@@ -83,6 +89,7 @@ private:
     int handleTop() const;
     QLabel* makeHandle();
     void loadDragBase();
+    void showShadow(bool show);
 
     QPointer<QWidget> m_left;
     QPointer<QWidget> m_right;
@@ -100,5 +107,4 @@ private:
     bool m_hasFocus = false;
     QLabel* m_handle = nullptr;
     std::array<QPixmap, 3> m_dragBase; // left, centre and right; loaded when the item is first lifted
-    QGraphicsDropShadowEffect* m_shadow = nullptr; // owned by the widget
 };

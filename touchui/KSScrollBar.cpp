@@ -77,16 +77,33 @@ void KSScrollBar::keyReleaseEvent(QKeyEvent* event)
     QScrollBar::keyReleaseEvent(event);
 }
 
-const QPixmap& KSScrollBar::base()
+// Scaled once for each size of the bar: a list that scrolls paints the whole bar at each step.
+const QPixmap& KSScrollBar::track()
 {
-    if (m_base.isNull()) {
-        m_base.load(orientation() == Qt::Vertical ? QStringLiteral(":/Scrollbar/Scbar_base_v")
-                                                  : QStringLiteral(":/Scrollbar/Scbar_base_h"));
-    }
-    return m_base;
+    if (m_track.size() == size())
+        return m_track;
+    m_track = QPixmap(size());
+    m_track.fill(QColor(51, 51, 51));
+    const QPixmap base(orientation() == Qt::Vertical ? QStringLiteral(":/Scrollbar/Scbar_base_v")
+                                                     : QStringLiteral(":/Scrollbar/Scbar_base_h"));
+    QPainter painter(&m_track);
+    if (!base.isNull())
+        painter.drawPixmap(rect(), base);
+    return m_track;
 }
 
-const KSScrollBar::Handle& KSScrollBar::handlePictures()
+const QPixmap& KSScrollBar::stretchedCenter(Handle& handle, QSize size)
+{
+    if (handle.stretched.size() == size)
+        return handle.stretched;
+    handle.stretched = QPixmap(size);
+    handle.stretched.fill(Qt::transparent);
+    QPainter painter(&handle.stretched);
+    painter.drawPixmap(QRect(QPoint(0, 0), size), handle.center);
+    return handle.stretched;
+}
+
+KSScrollBar::Handle& KSScrollBar::handlePictures()
 {
     Handle& handle = m_handles[m_pressed ? 1 : 0];
     bool& loaded = m_loaded[m_pressed ? 1 : 0];
@@ -124,17 +141,15 @@ void KSScrollBar::paintEvent(QPaintEvent*)
 
 void KSScrollBar::paintVertical(QPainter* painter, QRect& handle)
 {
-    painter->fillRect(rect(), QColor(51, 51, 51));
-    if (!base().isNull())
-        painter->drawPixmap(rect(), base());
-    const Handle& pictures = handlePictures();
+    painter->drawPixmap(0, 0, track());
+    Handle& pictures = handlePictures();
     const int x = handle.x() + (handle.width() - pictures.center.width()) / 2;
     const int first = pictures.first.height();
     const int last = pictures.last.height();
     painter->drawPixmap(x, handle.y(), pictures.first);
     const QRect center(x, handle.y() + first, pictures.center.width(), handle.height() - first - last);
     if (center.height() > 0)
-        painter->drawPixmap(center, pictures.center);
+        painter->drawPixmap(center.topLeft(), stretchedCenter(pictures, center.size()));
     painter->drawPixmap(x, handle.bottom() + 1 - last, pictures.last);
     if (center.height() >= pictures.grip.height()) {
         painter->drawPixmap(handle.x() + (handle.width() - pictures.grip.width()) / 2,
@@ -144,17 +159,15 @@ void KSScrollBar::paintVertical(QPainter* painter, QRect& handle)
 
 void KSScrollBar::paintHorizontal(QPainter* painter, QRect& handle)
 {
-    painter->fillRect(rect(), QColor(51, 51, 51));
-    if (!base().isNull())
-        painter->drawPixmap(rect(), base());
-    const Handle& pictures = handlePictures();
+    painter->drawPixmap(0, 0, track());
+    Handle& pictures = handlePictures();
     const int y = handle.y() + (handle.height() - pictures.center.height()) / 2;
     const int first = pictures.first.width();
     const int last = pictures.last.width();
     painter->drawPixmap(handle.x(), y, pictures.first);
     const QRect center(handle.x() + first, y, handle.width() - first - last, pictures.center.height());
     if (center.width() > 0)
-        painter->drawPixmap(center, pictures.center);
+        painter->drawPixmap(center.topLeft(), stretchedCenter(pictures, center.size()));
     painter->drawPixmap(handle.right() + 1 - last, y, pictures.last);
     if (center.width() >= pictures.grip.width()) {
         painter->drawPixmap(center.x() + (center.width() - pictures.grip.width()) / 2,

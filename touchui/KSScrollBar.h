@@ -38,10 +38,12 @@ private:
         QPixmap center;
         QPixmap last;
         QPixmap grip;
+        QPixmap stretched; // the centre in the size in which it was painted last
     };
     void init();
-    const Handle& handlePictures();
-    const QPixmap& base();
+    Handle& handlePictures();
+    const QPixmap& track();
+    static const QPixmap& stretchedCenter(Handle& handle, QSize size);
     void followFinger(QEvent::Type type);
     void sendMouse(QEvent::Type type, const QPoint& position);
     void letGo();
@@ -49,6 +51,6 @@ private:
     OneFinger m_finger{this};
     bool m_pressed = false;
     Handle m_handles[2]; // at rest and pressed; loaded on first use
-    QPixmap m_base;
+    QPixmap m_track;     // in the size of the bar
     bool m_loaded[2] = {false, false};
 };

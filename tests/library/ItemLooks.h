@@ -1,21 +1,22 @@
 #pragma once
 
+#include "library/ArchiveItem.h"
 #include "library/TemplateItem.h"
+#include "library/TitleLines.h"
 
-#include <QLabel>
 #include <QStringList>
 
-// Returns the text lines that an item of the list shows; none before its contents were made.
-inline QStringList textLines(const QWidget* item)
+// Returns the part of an item that shows its texts; null before its contents were made.
+inline TitleLines* textArea(const ArchiveItem* item)
 {
-    QStringList lines;
-    const QList<QLabel*> labels = item->findChildren<QLabel*>();
-    for (const QLabel* label : labels) {
-        const bool isHandle = label->parentWidget() == item;
-        if (!isHandle)
-            lines.append(label->text());
-    }
-    return lines;
+    return qobject_cast<TitleLines*>(item->getRightChild());
+}
+
+// Returns the text lines that an item of the list shows; none before its contents were made.
+inline QStringList textLines(const ArchiveItem* item)
+{
+    const TitleLines* area = textArea(item);
+    return area ? area->lines() : QStringList();
 }
 
 // Returns whether the template has the frame of the selected one.

@@ -336,8 +336,8 @@ void tst_archivelist::tapSelectsAndTellsTheCanvas()
     QCOMPARE(m_canvas, (QStringList{QStringLiteral("b")}));
     QCOMPARE(leaving.count(), 1); // the pictures of the previous title are made
     QCOMPARE(m_stack.count(), 1);
-    QCOMPARE(item(2)->styleSheet(), ArchiveItem::UN_OPERATE_AND_SELECT_STATE);
-    QCOMPARE(item(0)->styleSheet(), ArchiveItem::UN_OPERATE_AND_UN_SELECT_STATE);
+    QCOMPARE(item(2)->look(), ArchiveItem::UN_OPERATE_AND_SELECT_STATE);
+    QCOMPARE(item(0)->look(), ArchiveItem::UN_OPERATE_AND_UN_SELECT_STATE);
     QVERIFY(item(2)->isSelected() && !item(0)->isSelected());
 }
 
@@ -346,9 +346,9 @@ void tst_archivelist::tapOnTheSelectedItemChangesNothing()
     m_list->refreshArchiveList(threeTitles(QStringLiteral("twice")));
     m_canvas.clear();
     m_list->selectOperationArchive(0);
-    QCOMPARE(item(0)->styleSheet(), ArchiveItem::OPERATE_AND_SELECT_STATE);
+    QCOMPARE(item(0)->look(), ArchiveItem::OPERATE_AND_SELECT_STATE);
     tap(0);
-    QCOMPARE(item(0)->styleSheet(), ArchiveItem::UN_OPERATE_AND_SELECT_STATE); // only the border changes
+    QCOMPARE(item(0)->look(), ArchiveItem::UN_OPERATE_AND_SELECT_STATE); // only the border changes
     QVERIFY(m_canvas.isEmpty());
     QCOMPARE(m_stack.count(), 0);
 }
@@ -376,12 +376,12 @@ void tst_archivelist::longHoldOpensTheMenuAndSelectsNothing()
     QTest::mousePress(item(1), Qt::LeftButton, Qt::NoModifier, QPoint(20, 20));
     QTRY_COMPARE(shown.count(), 1);
     QVERIFY(m_list->IsOptionMenuShowing());
-    QCOMPARE(item(1)->styleSheet(), ArchiveItem::OPERATE_AND_UN_SELECT_STATE);
+    QCOMPARE(item(1)->look(), ArchiveItem::OPERATE_AND_UN_SELECT_STATE);
     QTest::mouseRelease(item(1), Qt::LeftButton, Qt::NoModifier, QPoint(20, 20));
     QVERIFY(m_canvas.isEmpty());
     m_list->slotHideOptionMenu();
     QVERIFY(!m_list->IsOptionMenuShowing());
-    QCOMPARE(item(1)->styleSheet(), ArchiveItem::UN_OPERATE_AND_UN_SELECT_STATE);
+    QCOMPARE(item(1)->look(), ArchiveItem::UN_OPERATE_AND_UN_SELECT_STATE);
     tap(1);
     QCOMPARE(m_canvas, (QStringList{QStringLiteral("a")}));
 
@@ -419,8 +419,8 @@ void tst_archivelist::menuOnAnItem()
     QCOMPARE(m_list->getCurrentOperationArchive(), item(1));
     m_list->slotHideOptionMenu();
     QTest::mouseClick(item(2), Qt::RightButton, Qt::NoModifier, QPoint(20, 20));
-    QCOMPARE(item(1)->styleSheet(), ArchiveItem::UN_OPERATE_AND_UN_SELECT_STATE);
-    QCOMPARE(item(2)->styleSheet(), ArchiveItem::OPERATE_AND_UN_SELECT_STATE);
+    QCOMPARE(item(1)->look(), ArchiveItem::UN_OPERATE_AND_UN_SELECT_STATE);
+    QCOMPARE(item(2)->look(), ArchiveItem::OPERATE_AND_UN_SELECT_STATE);
 }
 
 void tst_archivelist::wheelHidesTheMenu()
@@ -530,22 +530,26 @@ void tst_archivelist::letterTailsAreWhole()
     archive.setText({LibraryFixture::makeText(text, 1)});
     ArchiveItem shown(&archive, ArchiveItem::LIST_ITEM);
     shown.initArchiveItemChildWidget();
-    auto* label = shown.findChild<QLabel*>();
-    QVERIFY(label);
-    QCOMPARE(label->text(), text);
-    const int letters = QFontMetrics(label->font()).horizontalAdvance(QStringLiteral("gjp"));
-    const auto ink = [label, letters] {
-        const QImage image = label->grab().toImage();
+    QCOMPARE(textLines(&shown).front(), text);
+    TitleLines::Form form = textArea(&shown)->form();
+    form.background = Qt::black;
+    const auto ink = [&text, &family](TitleLines::Form shape) {
+        TitleLines lines(shape);
+        lines.setFixedSize(lines.lineRect(0).size());
+        lines.setTexts({text, QString()}, family);
+        const int letters = QFontMetrics(lines.lineFont()).horizontalAdvance(QStringLiteral("gjp"));
+        const QImage image = lines.grab().toImage();
         int pixels = 0;
         for (int y = 0; y < image.height(); ++y)
             for (int x = 0; x < letters; ++x)
                 pixels += image.pixelColor(x, y).lightness() > 128 ? 1 : 0;
         return pixels;
     };
-    const int inTheLine = ink();
+    const int inTheLine = ink(form);
     QVERIFY(inTheLine > 0);
-    label->setFixedHeight(4 * label->height());
-    QCOMPARE(inTheLine, ink());
+    TitleLines::Form high = form;
+    high.line.rheight() *= 4;
+    QCOMPARE(inTheLine, ink(high));
 }
 
 void tst_archivelist::itemStyles()
@@ -556,11 +560,11 @@ void tst_archivelist::itemStyles()
     shown.initArchiveItemChildWidget();
     const auto* picture = shown.findChild<CheckeredPicture*>();
     QCOMPARE(picture->geometry(), QRect(3, 2, 240, 135));
-    shown.setStyleSheet(ArchiveItem::OPERATE_AND_UN_SELECT_STATE);
+    shown.setLook(ArchiveItem::OPERATE_AND_UN_SELECT_STATE);
     QCOMPARE(shown.grab().toImage().pixelColor(250, 0), QColor(0, 186, 230));
-    shown.setStyleSheet(ArchiveItem::UN_OPERATE_AND_SELECT_STATE);
+    shown.setLook(ArchiveItem::UN_OPERATE_AND_SELECT_STATE);
     QVERIFY(shown.grab().toImage().pixelColor(246, 10).blue() > 150);
-    shown.setStyleSheet(ArchiveItem::UN_OPERATE_AND_UN_SELECT_STATE);
+    shown.setLook(ArchiveItem::UN_OPERATE_AND_UN_SELECT_STATE);
     QCOMPARE(shown.grab().toImage().pixelColor(246, 10), QColor(51, 51, 51));
 
     ArchiveItem narrow(&archive, ArchiveItem::NARROW_ITEM);
@@ -573,37 +577,37 @@ void tst_archivelist::itemText_data()
 {
     QTest::addColumn<int>("type");
     QTest::addColumn<QSize>("line");
-    QTest::addColumn<QString>("lineStyle");
-    QTest::addColumn<QString>("areaStyle");
+    QTest::addColumn<QColor>("ink");
+    QTest::addColumn<QColor>("background");
     QTest::addColumn<int>("top");
-    QTest::newRow("list") << int(ArchiveItem::LIST_ITEM) << QSize(254, 33)
-                          << " background: transparent; color:rgb(220, 220, 220);" << QString() << 0;
-    QTest::newRow("narrow") << int(ArchiveItem::NARROW_ITEM) << QSize(250, 24)
-                            << " background: transparent; color:rgb(178, 178, 178);"
-                            << " QWidget#mTextWidget { background:rgb(38, 38, 38); }" << 8;
+    QTest::newRow("list") << int(ArchiveItem::LIST_ITEM) << QSize(254, 33) << QColor(220, 220, 220)
+                          << QColor(51, 51, 51) << 0;
+    QTest::newRow("narrow") << int(ArchiveItem::NARROW_ITEM) << QSize(250, 24) << QColor(178, 178, 178)
+                            << QColor(38, 38, 38) << 8;
 }
 
 void tst_archivelist::itemText()
 {
     QFETCH(const int, type);
     QFETCH(const QSize, line);
-    QFETCH(const QString, lineStyle);
-    QFETCH(const QString, areaStyle);
+    QFETCH(const QColor, ink);
+    QFETCH(const QColor, background);
     QFETCH(const int, top);
     Archive archive;
+    archive.setText({LibraryFixture::makeText(QStringLiteral("\u2588\u2588"), 1)}); // full blocks
     ArchiveItem shown(&archive, type);
     shown.initArchiveItemChildWidget();
-    const QWidget* area = shown.getRightChild();
+    const TitleLines* area = textArea(&shown);
     QVERIFY(area);
     QCOMPARE(area->objectName(), QStringLiteral("mTextWidget"));
-    QCOMPARE(area->styleSheet(), areaStyle);
     QCOMPARE(area->size(), QSize(254, 135));
-    const QList<QLabel*> lines = area->findChildren<QLabel*>();
-    QCOMPARE(lines.size(), 4);
-    for (int i = 0; i < 4; ++i) {
-        QCOMPARE(lines.at(i)->geometry(), QRect(QPoint(0, top + i * line.height()), line));
-        QCOMPARE(lines.at(i)->styleSheet(), lineStyle);
-    }
+    QCOMPARE(textLines(&shown).size(), 4);
+    for (int i = 0; i < 4; ++i)
+        QCOMPARE(area->lineRect(i), QRect(QPoint(0, top + i * line.height()), line));
+    const QImage look = shown.grab().toImage();
+    const QPoint text = area->pos() + area->textRect(0).topLeft();
+    QCOMPARE(look.pixelColor(text + QPoint(10, line.height() / 2)), ink);
+    QCOMPARE(look.pixelColor(area->geometry().center()), background);
 }
 
 void tst_archivelist::cloneOfAnItem()
@@ -616,7 +620,7 @@ void tst_archivelist::cloneOfAnItem()
     original.reset();
     archive.reset();
     QCOMPARE(textLines(clone.get()).front(), QStringLiteral("twin"));
-    QCOMPARE(clone->styleSheet(), ArchiveItem::OPERATE_AND_SELECT_STATE);
+    QCOMPARE(clone->look(), ArchiveItem::OPERATE_AND_SELECT_STATE);
 }
 
 void tst_archivelist::followsARenamedFolder()
@@ -718,17 +722,17 @@ void tst_archivelist::selectionIsScrolledIntoView()
 void tst_archivelist::moveModeIgnoresTaps()
 {
     m_list->refreshArchiveList(threeTitles(QStringLiteral("move mode")));
-    QVERIFY(!m_list->isMoveMode());
+    QVERIFY(!m_list->itemsCanDrag());
     QSignalSpy drag(m_list.get(), &ArchiveList::signalItemsCanDrag);
     m_list->moveButtonClicked(true);
-    QVERIFY(m_list->isMoveMode());
+    QVERIFY(m_list->itemsCanDrag());
     m_canvas.clear();
     tap(1);
     QTest::mouseClick(item(1), Qt::RightButton, Qt::NoModifier, QPoint(20, 20));
     QVERIFY(m_canvas.isEmpty());
     QVERIFY(!m_list->IsOptionMenuShowing());
     m_list->moveButtonClicked(false);
-    QVERIFY(!m_list->isMoveMode());
+    QVERIFY(!m_list->itemsCanDrag());
     QCOMPARE(drag.count(), 2);
 }
 
@@ -756,7 +760,7 @@ void tst_archivelist::language()
     m_list->slotHideOptionMenu();
     m_list->translateText();
     m_list->setSystemLanFont(QStringLiteral("DFHeiW5-A"));
-    const QFont font = item(0)->getRightChild()->findChild<QLabel*>()->font();
+    const QFont font = textArea(item(0))->lineFont();
     QCOMPARE(font.family(), QStringLiteral("DFHeiW5-A"));
     QCOMPARE(font.pixelSize(), 28);
     QTest::mouseClick(item(1), Qt::RightButton, Qt::NoModifier, QPoint(20, 20));

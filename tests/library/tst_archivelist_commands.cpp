@@ -179,7 +179,7 @@ void tst_archivelist_commands::deletedTitleFollowsTheLanguage()
     choose(1, ArchiveAction::ACTION_DELETE);
     m_list->setSystemLanFont(QStringLiteral("DFHeiW5-A"));
     m_stack->undo();
-    QCOMPARE(item(1)->getRightChild()->findChild<QLabel*>()->font().family(), QStringLiteral("DFHeiW5-A"));
+    QCOMPARE(textArea(item(1))->lineFont().family(), QStringLiteral("DFHeiW5-A"));
     m_list->setSystemLanFont(QStringLiteral("KST"));
 }
 
@@ -348,19 +348,19 @@ void tst_archivelist_commands::undoOfAMoveEndsTheOperation()
     m_list->addWidgetItem(moved, 2);
     m_list->selectOperationArchive(2);
     m_stack->push(new MoveArchiveCommand(m_list.get(), moved, 1, 2));
-    QCOMPARE(moved->styleSheet(), ArchiveItem::OPERATE_AND_UN_SELECT_STATE);
+    QCOMPARE(moved->look(), ArchiveItem::OPERATE_AND_UN_SELECT_STATE);
     QVERIFY(events.take().isEmpty());
     m_stack->undo();
-    QCOMPARE(moved->styleSheet(), ArchiveItem::UN_OPERATE_AND_UN_SELECT_STATE);
+    QCOMPARE(moved->look(), ArchiveItem::UN_OPERATE_AND_UN_SELECT_STATE);
     QCOMPARE(events.take(), (QList<QPair<int, bool>>{{2, false}}));
     m_stack->redo();
     QVERIFY(events.take().isEmpty());
 
     // The chosen title keeps its border.
     m_list->selectOperationArchive(0);
-    QCOMPARE(item(0)->styleSheet(), ArchiveItem::OPERATE_AND_SELECT_STATE);
+    QCOMPARE(item(0)->look(), ArchiveItem::OPERATE_AND_SELECT_STATE);
     m_stack->undo();
-    QCOMPARE(item(0)->styleSheet(), ArchiveItem::UN_OPERATE_AND_SELECT_STATE);
+    QCOMPARE(item(0)->look(), ArchiveItem::UN_OPERATE_AND_SELECT_STATE);
     QCOMPARE(events.take(), (QList<QPair<int, bool>>{{2, false}}));
 }
 
@@ -376,7 +376,7 @@ void tst_archivelist_commands::runOfTapsIsOneStep()
     m_stack->undo();
     QCOMPARE(m_canvas.back(), QStringLiteral("before"));
     QCOMPARE(selected(), 0);
-    QCOMPARE(item(3)->styleSheet(), ArchiveItem::UN_OPERATE_AND_UN_SELECT_STATE);
+    QCOMPARE(item(3)->look(), ArchiveItem::UN_OPERATE_AND_UN_SELECT_STATE);
     m_stack->redo();
     QCOMPARE(m_canvas.back(), QStringLiteral("c"));
     QCOMPARE(selected(), 3);

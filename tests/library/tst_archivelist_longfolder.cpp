@@ -43,6 +43,7 @@ private Q_SLOTS:
     void manyUnreadableLeaveRoom();
     void deleteFarDown();
     void moveFarDown();
+    void moveModeReachesLateItems();
     void languageReachesLateItems();
     void loadedByTheThread();
 
@@ -222,7 +223,7 @@ void tst_archivelist_longfolder::selectedItemIsKept()
     QCOMPARE(m->selected(), 102);
     QCOMPARE(m->item(102), selected.data());
     QCOMPARE(m->item(150), operation.data());
-    QCOMPARE(m->item(102)->styleSheet(), ArchiveItem::UN_OPERATE_AND_SELECT_STATE);
+    QCOMPARE(m->item(102)->look(), ArchiveItem::UN_OPERATE_AND_SELECT_STATE);
 }
 
 void tst_archivelist_longfolder::itemsOfUndoStepsAreKept()
@@ -497,14 +498,29 @@ void tst_archivelist_longfolder::moveFarDown()
     m->list->moveButtonClicked(false);
 }
 
+void tst_archivelist_longfolder::moveModeReachesLateItems()
+{
+    openLong();
+    m->list->moveButtonClicked(true);
+    m->list->moveToWidgetItem(300);
+    QVERIFY(m->item(300)->hasDragFlag());
+    QTRY_VERIFY(m->item(300)->hasChildWidgets());
+    const TitleLines* lines = textArea(m->item(300));
+    const int narrow = lines->lineWidth();
+    QVERIFY(lines->x() + narrow <= ArchiveItem::WIDGET_WIDTH - 22); // left of the handle
+    m->list->moveButtonClicked(false);
+    QVERIFY(!m->item(300)->hasDragFlag());
+    QCOMPARE(lines->lineWidth(), ArchiveItem::DISPLY_TEXT_SIZE_LENTH);
+    QVERIFY(narrow < lines->lineWidth());
+}
+
 void tst_archivelist_longfolder::languageReachesLateItems()
 {
     openLong();
     m->list->setSystemLanFont(QStringLiteral("DFHeiW5-A"));
     m->list->moveToWidgetItem(250);
     QTRY_VERIFY(m->item(250)->hasChildWidgets());
-    QCOMPARE(m->item(250)->getRightChild()->findChild<QLabel*>()->font().family(),
-             QStringLiteral("DFHeiW5-A"));
+    QCOMPARE(textArea(m->item(250))->lineFont().family(), QStringLiteral("DFHeiW5-A"));
     m->list->setSystemLanFont(QStringLiteral("KST"));
 }
 

@@ -140,13 +140,13 @@ void tst_archivelist_touch::holdOpensTheMenuAndSelectsNothing()
     QVERIFY(!m->list->IsOptionMenuShowing());
     m->clock.advance(1);
     QVERIFY(m->list->IsOptionMenuShowing());
-    QCOMPARE(m->item(1)->styleSheet(), ArchiveItem::OPERATE_AND_UN_SELECT_STATE);
+    QCOMPARE(m->item(1)->look(), ArchiveItem::OPERATE_AND_UN_SELECT_STATE);
     m->release(List::PICTURE_X, 200);
     QCOMPARE(m->takeCanvas(), Names());
     QVERIFY(m->list->IsOptionMenuShowing());
     QCOMPARE(enabledActions(), (Names{"Create New", "Copy", "Delete", "Save as Template"}));
     m->list->slotHideOptionMenu();
-    QCOMPARE(m->item(1)->styleSheet(), ArchiveItem::UN_OPERATE_AND_UN_SELECT_STATE);
+    QCOMPARE(m->item(1)->look(), ArchiveItem::UN_OPERATE_AND_UN_SELECT_STATE);
     m->tapTitle(1);
     QCOMPARE(m->takeCanvas(), Names{"t01"});
 }
@@ -204,7 +204,7 @@ void tst_archivelist_touch::pressBesideTheMenuOnlyClosesIt()
     m->tapTitle(5);
     QVERIFY(!m->list->IsOptionMenuShowing());
     QCOMPARE(m->takeCanvas(), Names());
-    QCOMPARE(m->item(0)->styleSheet(), ArchiveItem::UN_OPERATE_AND_SELECT_STATE);
+    QCOMPARE(m->item(0)->look(), ArchiveItem::UN_OPERATE_AND_SELECT_STATE);
     m->tapTitle(5);
     QCOMPARE(m->takeCanvas(), Names{"t05"});
 }
@@ -280,7 +280,7 @@ void tst_archivelist_touch::copyPasteAndDelete()
 {
     const QString folder = openFolder(QStringLiteral("copy"), 3);
     m->holdAndChoose(1, ArchiveAction::ACTION_COPY);
-    QCOMPARE(m->item(1)->styleSheet(), ArchiveItem::OPERATE_AND_UN_SELECT_STATE); // the border is kept
+    QCOMPARE(m->item(1)->look(), ArchiveItem::OPERATE_AND_UN_SELECT_STATE); // the border is kept
     m->holdAndChoose(1, ArchiveAction::ACTION_DELETE);
     QCOMPARE(m->stems(), (Names{"t00", "t02"}));
     QVERIFY(QFile::remove(folder + "/t01.xml")); // the copy does not need its source
@@ -382,13 +382,13 @@ void tst_archivelist_touch::carryDown()
     QCOMPARE(m_folders.take(), Names{"order down"});
     QCOMPARE(m->stack.count(), 1);
     QCOMPARE(m->selected(), 1); // the same title is on the canvas
-    QCOMPARE(m->item(1)->styleSheet(), ArchiveItem::OPERATE_AND_SELECT_STATE);
+    QCOMPARE(m->item(1)->look(), ArchiveItem::OPERATE_AND_SELECT_STATE);
 
     m->stack.undo();
     QCOMPARE(m->stems(), numbered(4));
     QCOMPARE(LibraryFixture::order(folder), m->stems());
     QCOMPARE(m_folders.take(), Names{"order down"});
-    QCOMPARE(m->item(0)->styleSheet(), ArchiveItem::UN_OPERATE_AND_SELECT_STATE);
+    QCOMPARE(m->item(0)->look(), ArchiveItem::UN_OPERATE_AND_SELECT_STATE);
     m->stack.redo();
     QCOMPARE(m->stems(), (Names{"t01", "t00", "t02", "t03"}));
     QCOMPARE(m->takeCanvas(), Names());
@@ -486,7 +486,7 @@ void tst_archivelist_touch::leavingMoveModeDropsTheTitle()
     m->release(List::HANDLE_X, 600);
     QCOMPARE(m->stems(), (Names{"t01", "t00", "t02", "t03"}));
     QCOMPARE(m->takeCanvas(), Names());
-    QCOMPARE(m->item(1)->styleSheet(), ArchiveItem::UN_OPERATE_AND_SELECT_STATE);
+    QCOMPARE(m->item(1)->look(), ArchiveItem::UN_OPERATE_AND_SELECT_STATE);
     QVERIFY(!m->item(1)->hasDragFlag());
 }
 
@@ -499,7 +499,7 @@ void tst_archivelist_touch::floatingTitleLooksLikeTheOne()
     QVERIFY(floating && floating->isVisible());
     QCOMPARE(floating->size(), QSize(ArchiveItem::WIDGET_WIDTH, ArchiveItem::WIDGET_HEIGHT));
     QCOMPARE(textLines(floating).front(), QStringLiteral("t01"));
-    QCOMPARE(floating->styleSheet(), ArchiveItem::OPERATE_AND_UN_SELECT_STATE);
+    QCOMPARE(floating->look(), ArchiveItem::OPERATE_AND_UN_SELECT_STATE);
     QVERIFY(floating->hasDragFlag());
     QCOMPARE(floating->x(), m->list->x() + 38 + 20); // aside from under the finger
     m->release(List::HANDLE_X, 400);

@@ -201,7 +201,7 @@ void tst_archivemenu::savingTheShownTitleSelectsNothing()
     QSignalSpy added(m->list, &ArchiveList::addUserSignal);
     m->hold(List::PICTURE_X, 7 * List::ROW + 10 - 120);
     QCOMPARE(m->value(), 120);
-    QCOMPARE(m->item(7)->styleSheet(), ArchiveItem::OPERATE_AND_SELECT_STATE);
+    QCOMPARE(m->item(7)->look(), ArchiveItem::OPERATE_AND_SELECT_STATE);
     m->choose(ArchiveAction::ACTION_ADD_USER);
     QCOMPARE(added.size(), 1);
     QCOMPARE(leaving.size(), 1);
@@ -209,7 +209,7 @@ void tst_archivemenu::savingTheShownTitleSelectsNothing()
     QCOMPARE(m->value(), 120);
     QCOMPARE(m->selected(), 7);
     QVERIFY(m->item(7)->isSelected());
-    QCOMPARE(m->item(7)->styleSheet(), ArchiveItem::UN_OPERATE_AND_SELECT_STATE);
+    QCOMPARE(m->item(7)->look(), ArchiveItem::UN_OPERATE_AND_SELECT_STATE);
     QCOMPARE(m->takeCanvas(), Names());
 }
 

@@ -184,10 +184,9 @@ private Q_SLOTS:
         const QWidget* tabs = users()->parentWidget()->parentWidget();
         const int right = preview()->mapTo(tabs, QPoint(preview()->width(), 0)).x();
         QVERIFY2(right <= TemplatePicker::TAB_AREA_WIDTH - 2 - 4, qPrintable(QString::number(right)));
-        for (const QLabel* line : preview()->getRightChild()->findChildren<QLabel*>()) {
-            QVERIFY(line->contentsRect().left() >= 8);
-            QVERIFY(line->contentsRect().right() <= preview()->width() - 8);
-        }
+        const QRect text = textArea(preview())->textRect(0);
+        QVERIFY(text.left() >= 8);
+        QVERIFY(text.right() <= preview()->width() - 8);
     }
 
     void cornersAreNotPartOfTheDialog()

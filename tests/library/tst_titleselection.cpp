@@ -25,20 +25,20 @@ void tst_titleselection::looksFollowTheMarks()
     selection.select(&first);
     TitleSelection::showSelected(&first);
     QCOMPARE(selection.selected(), &first);
-    QCOMPARE(first.styleSheet(), ArchiveItem::UN_OPERATE_AND_SELECT_STATE);
+    QCOMPARE(first.look(), ArchiveItem::UN_OPERATE_AND_SELECT_STATE);
 
     selection.mark(&first);
-    QCOMPARE(first.styleSheet(), ArchiveItem::OPERATE_AND_SELECT_STATE);
+    QCOMPARE(first.look(), ArchiveItem::OPERATE_AND_SELECT_STATE);
     selection.removeBorder(&first);
-    QCOMPARE(first.styleSheet(), ArchiveItem::UN_OPERATE_AND_SELECT_STATE);
+    QCOMPARE(first.look(), ArchiveItem::UN_OPERATE_AND_SELECT_STATE);
 
     selection.mark(&second);
     QCOMPARE(selection.operation(), &second);
-    QCOMPARE(second.styleSheet(), ArchiveItem::OPERATE_AND_UN_SELECT_STATE);
+    QCOMPARE(second.look(), ArchiveItem::OPERATE_AND_UN_SELECT_STATE);
     selection.removeBorder(&second);
-    QCOMPARE(second.styleSheet(), ArchiveItem::UN_OPERATE_AND_UN_SELECT_STATE);
+    QCOMPARE(second.look(), ArchiveItem::UN_OPERATE_AND_UN_SELECT_STATE);
     TitleSelection::showDefault(&first);
-    QCOMPARE(first.styleSheet(), ArchiveItem::UN_OPERATE_AND_UN_SELECT_STATE);
+    QCOMPARE(first.look(), ArchiveItem::UN_OPERATE_AND_UN_SELECT_STATE);
 }
 
 void tst_titleselection::nullChangesNothing()
@@ -55,7 +55,7 @@ void tst_titleselection::nullChangesNothing()
     TitleSelection::showDefault(nullptr);
     QCOMPARE(selection.selected(), &item);
     QCOMPARE(selection.operation(), &item);
-    QCOMPARE(item.styleSheet(), ArchiveItem::OPERATE_AND_SELECT_STATE);
+    QCOMPARE(item.look(), ArchiveItem::OPERATE_AND_SELECT_STATE);
 }
 
 void tst_titleselection::destroyedItemsAreForgotten()
