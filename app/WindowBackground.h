@@ -4,6 +4,9 @@
 
 #include <QImage>
 #include <QPixmap>
+#include <QPoint>
+
+#include <vector>
 
 class QPainter;
 
@@ -16,12 +19,17 @@ public:
     void paint(QPainter& painter);
 
 private:
+    struct Strip {
+        QPoint place; // in the picture
+        QPixmap picture;
+    };
+
     void load();
 
     // Painted from their pieces: a pixmap as large as the window is mostly its even middle.
     DrawBoundingRectangle m_windowFrame;
     DrawBoundingRectangle m_leftFrame;
-    QPixmap m_canvasSurround;
-    QImage m_vertical; // separators
+    std::vector<Strip> m_canvasSurround; // without what the canvas covers
+    QImage m_vertical;                   // separators
     QImage m_horizontal;
 };

@@ -1,5 +1,6 @@
 #include "bench/PeerProcess.h"
 
+#include <QDeadlineTimer>
 #include <signal.h>
 #include <sys/prctl.h>
 
@@ -37,6 +38,18 @@ bool PeerProcess::startAndAwait(const QString& program, const QStringList& argum
         read += m_process.readAllStandardOutput();
     }
     return read == line;
+}
+
+bool PeerProcess::awaitLine(const QByteArray& text)
+{
+    const QDeadlineTimer deadline(START_TIME);
+    while (true) {
+        while (m_process.canReadLine())
+            if (m_process.readLine().contains(text))
+                return true;
+        if (!m_process.waitForReadyRead(static_cast<int>(deadline.remainingTime())))
+            return false;
+    }
 }
 
 bool PeerProcess::start(const QString& program, const QStringList& arguments)

@@ -18,6 +18,9 @@ public:
     bool startRole(const QString& role);
     // Starts a program and waits for its first line. Returns false when that is missing or different.
     bool startAndAwait(const QString& program, const QStringList& arguments, const QByteArray& line);
+    // Waits for a line of the process that contains the text; discards the lines before it. Returns false
+    // when it does not come.
+    bool awaitLine(const QByteArray& text);
     // Starts a program and discards its output. Returns false when it cannot be started.
     bool start(const QString& program, const QStringList& arguments = {});
     // Waits for the end of the process. Returns whether it ended by itself with exit code 0.

@@ -1,15 +1,18 @@
-// The start of the process up to a listening port, with the siblings running, compared with a program that
-// shows and hides an empty window.
+// The start of the process up to a listening port and up to the answer to its first request, with the
+// siblings running, compared with a program that shows and hides an empty window.
 #include "bench/BenchEnvironment.h"
+#include "bench/BenchTitles.h"
 #include "bench/PairList.h"
 #include "bench/PeerProcess.h"
 #include "bench/Topics.h"
 #include "messaging/ptc/SocketFrame.h"
+#include "support/IPathManagerEx.h"
 
 #include <QDeadlineTimer>
 #include <QThread>
 #include <cerrno>
 #include <netinet/in.h>
+#include <sys/resource.h>
 #include <sys/socket.h>
 #include <unistd.h>
 
@@ -17,8 +20,11 @@ namespace
 {
 
 constexpr double AIM = 2.0;
-constexpr int START_TIME = 60000;   // milliseconds
-constexpr unsigned long POLL = 200; // microseconds
+constexpr double ANSWER_AIM = 2.5;
+constexpr int START_TIME = 60000;                   // milliseconds
+constexpr unsigned long POLL = 200;                 // microseconds
+const QByteArray READY = "{\"event\":\"ready\"}\n"; // the appliance's first line
+const QByteArray ANSWER = "\"setTopWindow\"";       // the first call of a titler that shows itself
 constexpr long MAIN = 1000;
 constexpr long SUB_PANEL = 1002;
 constexpr long TITLER = 1003;
@@ -89,6 +95,68 @@ void startTitler(benchmark::State& state)
     }
 }
 
+// Returns the processor time in seconds of the child processes that have ended.
+double timeOfEndedChildren()
+{
+    rusage usage{};
+    ::getrusage(RUSAGE_CHILDREN, &usage);
+    const auto seconds = [](const timeval& time) { return double(time.tv_sec) + double(time.tv_usec) / 1e6; };
+    return seconds(usage.ru_utime) + seconds(usage.ru_stime);
+}
+
+// Returns the path of a title in the data path of the titler.
+QString requestedTitle()
+{
+    static const std::string path = [] {
+        const std::wstring titles = IPathManagerEx::getInstance()->getTitleResourcesPath();
+        const std::string folder = QString::fromStdWString(titles).toStdString() + "/Requested";
+        return BenchTitles::writeFolder(folder, 1).front();
+    }();
+    return QString::fromStdString(path);
+}
+
+// Measures processor time: the titler takes two connections a second, so the time on the clock depends on
+// which sibling connects first.
+void answerFirstRequest(benchmark::State& state)
+{
+    if (!provide()) {
+        state.SkipWithError("the data path cannot be filled");
+        return;
+    }
+    const QByteArray request = "wait-titler\nedit \"" + requestedTitle().toUtf8() + "\"\n";
+    for ([[maybe_unused]] auto _ : state) {
+        PeerProcess appliance;
+        if (!appliance.startAndAwait(program("appliance"), {QStringLiteral("--stay")}, READY) ||
+            !waitListening(SUB_PANEL)) {
+            state.SkipWithError("the siblings do not listen");
+            break;
+        }
+        const double before = timeOfEndedChildren();
+        {
+            PeerProcess titler;
+            appliance.process().write(request);
+            if (!titler.start(program("titler")) || !appliance.awaitLine(ANSWER)) {
+                state.SkipWithError("the titler does not answer");
+                break;
+            }
+        }
+        state.SetIterationTime(timeOfEndedChildren() - before);
+    }
+}
+
+void showBareWindow(benchmark::State& state)
+{
+    for ([[maybe_unused]] auto _ : state) {
+        const double before = timeOfEndedChildren();
+        {
+            PeerProcess window;
+            if (!window.startAndAwait(program("bare_window"), {}, "hidden\n") || !window.finished(START_TIME))
+                state.SkipWithError("the window does not show");
+        }
+        state.SetIterationTime(timeOfEndedChildren() - before);
+    }
+}
+
 void startBareWindow(benchmark::State& state)
 {
     for ([[maybe_unused]] auto _ : state) {
@@ -107,4 +175,6 @@ void Topics::addStart(PairList& list)
 {
     list.add({"start_to_listening", AIM, PairList::Clock::Wall}, benchmark::kMillisecond, startTitler,
              startBareWindow);
+    list.add({"first_answer", ANSWER_AIM, PairList::Clock::Step}, benchmark::kMillisecond, answerFirstRequest,
+             showBareWindow);
 }

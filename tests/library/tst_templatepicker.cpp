@@ -120,8 +120,7 @@ private Q_SLOTS:
         m_picker->reloadTemplates(SystemSetupDef::emSystemLanguageChinese);
         m_fixture.makePresets("templates_chs", {"xin"});
         show();
-        const QList<TemplateItem*> shown = m_picker->findChildren<TemplateItem*>();
-        QCOMPARE(shown.size(), names(presets()).size());
+        QCOMPARE(m_picker->findChildren<TemplateItem*>().size(), names(presets()).size());
         QVERIFY(names(presets()).contains("xin"));
         m_picker->reloadTemplates(SystemSetupDef::emSystemLanguageEnglish); // at once while it is shown
         QCOMPARE(m_picker->findChildren<TemplateItem*>().size(), 1);
