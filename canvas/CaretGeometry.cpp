@@ -4,6 +4,7 @@
 
 #include <QTextBlock>
 #include <QTextLayout>
+#include <algorithm>
 
 namespace
 {
@@ -84,7 +85,9 @@ void CaretGeometry::caretsOfBlock(const QTextBlock& block, std::vector<Caret>& c
     for (int i = 0; i < block.layout()->lineCount(); ++i) {
         const QTextLine line = block.layout()->lineAt(i);
         const double top = bottomOf(block, line) - line.height();
-        for (int column = line.textStart(); column < line.textStart() + line.textLength(); ++column)
+        // The line also has the text that an input method composes, which is not in the block.
+        const int end = std::min(line.textStart() + line.textLength(), block.length());
+        for (int column = line.textStart(); column < end; ++column)
             carets[size_t(column)] = {line.cursorToX(column) + CARET_SHIFT + margin, top, line.height()};
     }
 }

@@ -16,6 +16,7 @@
 #include <QTextOption>
 #include <algorithm>
 #include <cmath>
+#include <utility>
 
 using namespace TextObjectConstants;
 
@@ -82,8 +83,15 @@ RecordLayout::RecordLayout(const TextObjectParts& parts) : m_parts(parts)
 {
 }
 
-// Estimates the margins from the tallest font, which saves a second layout. Only a line of mixed fonts may be
-// taller.
+// Returns the margin that probably fits the record, which saves a second layout: while the fonts stay as tall
+// as they were, what fitted last.
+double RecordLayout::probableMargin()
+{
+    const double expected = expectedMargin();
+    return std::exchange(m_lastExpectedMargin, expected) == expected ? m_lastMargin : expected;
+}
+
+// Estimates the margin from the tallest font. Only a line of mixed fonts may be taller.
 double RecordLayout::expectedMargin() const
 {
     double tallest = 0.0;
@@ -107,8 +115,7 @@ void RecordLayout::insertRecord()
     cursor.beginEditBlock();
     cursor.select(QTextCursor::Document);
     cursor.removeSelectedText();
-    const double margin = expectedMargin();
-    m_lastExpectedMargin = margin;
+    const double margin = probableMargin();
     QTextBlockFormat format = cursor.blockFormat();
     format.setLeftMargin(margin);
     format.setRightMargin(margin);
@@ -137,16 +144,11 @@ void RecordLayout::applyFormats(int begin, int end)
 
 void RecordLayout::applyStyles(int begin, int end)
 {
-    const double margin = expectedMargin();
     QTextCursor cursor(&m_parts.document);
     cursor.beginEditBlock();
     setFormats(cursor, begin, end);
-    // Where the fonts are as tall as before, the margins fit already, also if a line of mixed fonts is
-    // taller.
-    if (m_lastExpectedMargin != margin)
-        adjustLeftAndRightMargin(margin);
+    adjustLeftAndRightMargin(probableMargin());
     cursor.endEditBlock();
-    m_lastExpectedMargin = margin;
 }
 
 void RecordLayout::setFormats(QTextCursor& cursor, int begin, int end)
@@ -200,6 +202,7 @@ void RecordLayout::updateWidthAndAlign()
     }
     keepAnchor(width);
     m_lastWidth = width;
+    m_lastMargin = margin;
     m_lastHeight = document.size().height();
     m_lastBlocks = document.blockCount();
     m_parts.surface.layoutChanged();
@@ -212,6 +215,7 @@ void RecordLayout::updateAfterTyping(int position, int added)
                                      areaOfTyping(position, added));
     else
         updateWidthAndAlign();
+    m_isComposing = false;
 }
 
 // Returns where the paragraph may look different, in item coordinates. What stands before the word stays
@@ -223,8 +227,8 @@ QRectF RecordLayout::areaOfTyping(int position, int added) const
     const QString text = block.text();
     const QRectF lines = document.documentLayout()->blockBoundingRect(block);
     QRectF area(0.0, lines.top(), document.size().width(), lines.height());
-    if (alignmentOf(m_parts.styles.current()) == Qt::AlignLeft && block.layout()->lineCount() == 1 &&
-        isLeftToRight(text)) {
+    if (!m_isComposing && alignmentOf(m_parts.styles.current()) == Qt::AlignLeft &&
+        block.layout()->lineCount() == 1 && isLeftToRight(text)) {
         const QTextLine line = block.layout()->lineAt(0);
         const double left = block.layout()->position().x();
         const int column = position - block.position();

@@ -31,6 +31,9 @@ public:
     // As above, after characters were added at the position or removed there (added is 0): repaints what of
     // their paragraph changed, if the object keeps its size and its paragraphs.
     void updateAfterTyping(int position, int added);
+    // Call when an input method composes text, which is laid out but not in the document: the next call of
+    // updateAfterTyping() repaints the whole paragraph.
+    void noteComposition() { m_isComposing = true; }
     // Makes the next call of updateWidthAndAlign() leave the object where it is.
     void forgetWidth() { m_lastWidth = 0.0; }
     // Call after characters were removed: the document reports the removal before it has laid itself out.
@@ -38,6 +41,7 @@ public:
     void finishLayout();
 
 private:
+    double probableMargin();
     double expectedMargin() const;
     double naturalWidth(double margin) const;
     double lineMargin() const;
@@ -55,6 +59,8 @@ private:
     TextObjectParts m_parts;
     double m_lastWidth = 0.0;
     double m_lastHeight = 0.0;
+    double m_lastMargin = 0.0;
     double m_lastExpectedMargin = 0.0;
     int m_lastBlocks = 0;
+    bool m_isComposing = false;
 };

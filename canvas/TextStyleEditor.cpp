@@ -109,8 +109,10 @@ bool TextStyleEditor::documentChanged(int position, int removed, int added)
     added = std::max(documentLength(m_document) - (m_styles.count() - removed), 0);
     added = cutOffCharsBeyondMaxNum(position, added);
     trimUnchanged(position, removed, added);
-    if (removed == 0 && added == 0)
+    if (removed == 0 && added == 0) {
+        m_layout.noteComposition();
         return false;
+    }
 
     m_listener.textTyped();
     m_undoFlag = 1;

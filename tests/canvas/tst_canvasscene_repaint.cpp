@@ -4,6 +4,7 @@
 
 #include <QAbstractEventDispatcher>
 #include <QFontDatabase>
+#include <QInputMethodEvent>
 #include <QPaintEvent>
 #include <QRegion>
 #include <QScreen>
@@ -368,6 +369,15 @@ void tst_canvasscene_repaint::somethingBetweenTwoKeys_data()
     QTest::newRow("a size shown, another caret") << Action([size, caretAt](Canvas& c) {
         size(c);
         caretAt(c, 2);
+    });
+    QTest::newRow("composed text, longer than what comes of it") << Action([](Canvas& c) {
+        c.text(1)->getSelectionInfo(0, 0, 8, 0);
+        QInputMethodEvent composing(QStringLiteral("wwwwww"), {});
+        QCoreApplication::sendEvent(&c.view, &composing);
+        QCoreApplication::processEvents();
+        QInputMethodEvent commit;
+        commit.setCommitString(QStringLiteral("i"));
+        QCoreApplication::sendEvent(&c.view, &commit);
     });
     // What a lock does to a finger that is on the canvas.
     QTest::newRow("a touch that is broken off") << Action([](Canvas& c) {

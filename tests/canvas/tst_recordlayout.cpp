@@ -95,6 +95,7 @@ private Q_SLOTS:
     void init();
     void layouts_data();
     void layouts();
+    void undoLaysOutOnce();
     void isThatOfAFreshLayout_data();
     void isThatOfAFreshLayout();
     void parentIsAsWide_data();
@@ -142,6 +143,22 @@ void tst_recordlayout::layouts()
     const QSignalSpy layouts(pair.child->document()->documentLayout(), &QAbstractTextDocumentLayout::update);
     change(pair);
     QCOMPARE(layouts.count(), expected);
+}
+
+// Fallback fonts and lines of several fonts are taller than the tallest font of the record.
+void tst_recordlayout::undoLaysOutOnce()
+{
+    TText record = aligned(LEFT, QStringLiteral("news \u5feb\u8baf\u901f\u5831 live\nmore"));
+    record.textItems()[2]->setFontSize(80);
+    record.textItems()[12]->setFontFamily("DejaVu Sans");
+    Pair pair(record);
+    const TText before = pair.record();
+    bold(0, int(before.textItems().size()))(pair);
+    const QSignalSpy layouts(pair.child->document()->documentLayout(), &QAbstractTextDocumentLayout::update);
+    TText undone = before;
+    pair.child->resetDocument(&undone, 0);
+    QCOMPARE(layouts.count(), 1);
+    QVERIFY(!pair.record().textItems()[0]->isFontBold());
 }
 
 void tst_recordlayout::isThatOfAFreshLayout_data()
