@@ -10,6 +10,7 @@
 namespace PTC
 {
 class IObject;
+class IRemoteReceiver;
 class ISender;
 class Proxy;
 class QtReceiver;
@@ -67,8 +68,8 @@ private:
     void reportRefusal(long client);
 
     std::unique_ptr<ITitler> m_titler;
-    PTC::QtReceiver* m_receiver = nullptr;              // owned by the remote receiver while listening
-    std::unique_ptr<PTC::QtReceiver> m_unboundReceiver; // owns m_receiver when the port could not be bound
+    PTC::QtReceiver* m_receiver = nullptr; // owned by the remote receiver
+    std::unique_ptr<PTC::IRemoteReceiver> m_unboundReceiver; // the remote receiver when the port could not be bound
     std::vector<std::unique_ptr<PTC::IObject>> m_proxies;
     long m_nextAdapterId = 0;
     std::optional<long> m_lastRefusedClient;

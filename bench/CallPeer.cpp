@@ -47,9 +47,9 @@ bool CallFactory::listen(long client, PTC::IAdapterBase* adapter, bool callback)
     else
         receiver->addAdapter(adapter);
     auto sockets = std::make_unique<SocketRemoteReceiver>(0);
+    sockets->addReceiver(receiver.release());
     if (!sockets->initialize(client))
         return false;
-    sockets->addReceiver(receiver.release());
     setRemoteReceiver(sockets.release());
     return true;
 }

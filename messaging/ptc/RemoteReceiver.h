@@ -11,7 +11,7 @@ namespace PTC
 
 struct EventPacket;
 
-// Keeps the receivers of this process by id. The map is not changed once packets arrive.
+// Keeps the receivers of this process by id. Add them before initialize: packets that arrive earlier are dropped.
 class RemoteReceiver : public IRemoteReceiver
 {
 public:
@@ -38,7 +38,7 @@ private:
     IReceiver* findReceiver(long id);
 
     std::map<long, std::unique_ptr<IReceiver>> m_receivers;
-    std::mutex m_mutex; // the listening thread runs before the first addReceiver
+    std::mutex m_mutex; // guards the map, since packets arrive in threads of their own
     long m_id;
     long m_identity = -1;
 };

@@ -29,10 +29,10 @@ public:
             qputenv("K2SYS_PORT_OFFSET", QByteArray::number(offset));
             auto main = std::make_unique<SocketRemoteReceiver>(0);
             auto subPanel = std::make_unique<SocketRemoteReceiver>(0);
-            if (!main->initialize(1000) || !subPanel->initialize(1002))
-                continue;
             main->addReceiver(new Recorder(1, *this));
             subPanel->addReceiver(new Recorder(3, *this));
+            if (!main->initialize(1000) || !subPanel->initialize(1002))
+                continue;
             m_main = std::move(main);
             m_subPanel = std::move(subPanel);
             return true;
