@@ -18,6 +18,9 @@ public:
     bool startRole(const QString& role);
     // Starts a program and waits for its first line. Returns false when that is missing or different.
     bool startAndAwait(const QString& program, const QStringList& arguments, const QByteArray& line);
+    // Writes a line to the process and returns the line that it answers, without its end; empty when none
+    // comes.
+    QByteArray ask(const QByteArray& line);
     // Starts a program and discards its output. Returns false when it cannot be started.
     bool start(const QString& program, const QStringList& arguments = {});
     // Waits for the end of the process. Returns whether it ended by itself with exit code 0.
