@@ -42,7 +42,8 @@ bool TitlerToolFactory::initialize()
     receiver->addAdapter(adapter);
     m_receiver = receiver.get();
 
-    // A sibling may send its first request at the moment the port listens: there has to be a receiver by then.
+    // A sibling may send its first request at the moment the port listens: there has to be a receiver by
+    // then.
     auto remoteReceiver = std::make_unique<SocketRemoteReceiver>(SOCKET_RECEIVER_ID);
     remoteReceiver->addReceiver(receiver.release());
     if (!remoteReceiver->initialize(TITLER_CLIENT_NUMBER)) {

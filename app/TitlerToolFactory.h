@@ -69,7 +69,8 @@ private:
 
     std::unique_ptr<ITitler> m_titler;
     PTC::QtReceiver* m_receiver = nullptr; // owned by the remote receiver
-    std::unique_ptr<PTC::IRemoteReceiver> m_unboundReceiver; // the remote receiver when the port could not be bound
+    std::unique_ptr<PTC::IRemoteReceiver>
+        m_unboundReceiver; // the remote receiver when the port could not be bound
     std::vector<std::unique_ptr<PTC::IObject>> m_proxies;
     long m_nextAdapterId = 0;
     std::optional<long> m_lastRefusedClient;

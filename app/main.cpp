@@ -3,6 +3,7 @@
 #include "support/DataPathCheck.h"
 #include "support/DescriptorLimit.h"
 #include "support/FileSyncQueue.h"
+#include "support/HeapPolicy.h"
 #include "support/LeftoverSweep.h"
 #include "support/LogManager.h"
 #include "support/OwnerOnlyFiles.h"
@@ -14,7 +15,6 @@
 #include <QStringList>
 #include <chrono>
 #include <cstdio>
-#include <malloc.h>
 #include <string>
 
 namespace
@@ -24,25 +24,13 @@ const QString RIGHT_OPTION = QStringLiteral("-right");
 constexpr int RIGHT_WINDOW_LEFT = 1280;
 constexpr std::chrono::seconds SYNC_DEADLINE(10);
 constexpr int LOG_NUMBER = 400;
+constexpr int SMALL_PICTURES = 1024; // kB; widgets keep larger pictures themselves
 
 // Called in the GUI thread when a signal tells the process to end.
 void onSystemSingleCaught()
 {
     if (pMainWindow)
         pMainWindow->endProcess();
-}
-
-// Returns large blocks to the system at once. The process runs all day and renders a few large pictures at a
-// time, which would otherwise enlarge the heaps of the GUI and picture threads permanently.
-void keepMemoryFlat()
-{
-    constexpr int LARGE_BLOCK = 256 * 1024;
-    constexpr int HEAPS = 2;
-    constexpr int SMALL_PICTURES = 1024; // kB; widgets keep larger pictures themselves
-    mallopt(M_MMAP_THRESHOLD, LARGE_BLOCK);
-    mallopt(M_TRIM_THRESHOLD, LARGE_BLOCK);
-    mallopt(M_ARENA_MAX, HEAPS);
-    QPixmapCache::setCacheLimit(SMALL_PICTURES);
 }
 
 // Logs the files that are written but not synced, which a power failure may still destroy.
@@ -65,7 +53,8 @@ int main(int argc, char* argv[])
         return DataPathCheck::EXIT_CODE;
     }
     DescriptorLimit::raise();
-    keepMemoryFlat();
+    HeapPolicy::keepFlat();
+    QPixmapCache::setCacheLimit(SMALL_PICTURES);
     KSInputContext::install();
     QApplication application(argc, argv);
     application.setObjectName(QStringLiteral("Titler"));

@@ -3,6 +3,9 @@
 #include "document/ArchiveOrder.h"
 #include "document/TitleParser.h"
 
+#include <QDir>
+#include <QFile>
+#include <QFileInfo>
 #include <QRandomGenerator>
 #include <QString>
 #include <array>
@@ -18,8 +21,27 @@ constexpr int FIRST_NUMBER = 100;    // the first number with three digits
 constexpr std::size_t EXTENSION = 4; // length of ".xml"
 constexpr QSize SMALL_PICTURE(240, 135);
 constexpr int FOLDER_TITLE_CHARACTERS = 40;
+constexpr int DIFFERENT_TITLES = 200; // in a folder; more have the texts of these
 constexpr std::array COLORS = {"#FFFFFF", "#FFD24D", "#8FE3FF", "#FF6060"};
 constexpr std::u16string_view LETTERS = u"Breaking news from the coast 快讯速報 live at ten o'clock ";
+
+std::string nameOf(int number)
+{
+    return "20240101090000" + std::to_string(FIRST_NUMBER + number) + ".xml";
+}
+
+// Writes a title with the texts of another one, which takes a small part of the time of making it.
+void copyTitle(const std::string& folder, const std::string& from, const std::string& to)
+{
+    QFile source(QString::fromStdString(folder + '/' + from));
+    QFile target(QString::fromStdString(folder + '/' + to));
+    if (!source.open(QIODevice::ReadOnly) || !target.open(QIODevice::WriteOnly))
+        return;
+    const auto stem = [](const std::string& name) {
+        return QByteArray::fromStdString(name.substr(0, name.size() - EXTENSION));
+    };
+    target.write(source.readAll().replace(stem(from), stem(to)));
+}
 
 TextStyle styleOf(int position, const BenchTitles::Look& look)
 {
@@ -106,14 +128,19 @@ std::vector<std::string> BenchTitles::writeFolder(const std::string& folder, int
     std::vector<std::string> paths;
     std::vector<ArchiveOrder> rows;
     for (int i = 0; i < count; ++i) {
-        const std::string name = "20240101090000" + std::to_string(FIRST_NUMBER + i) + ".xml";
-        Archive archive = title(folder + '/' + name, FOLDER_TITLE_CHARACTERS, 48, texts);
-        parser.writeOneTitle(&archive);
+        const std::string name = nameOf(i);
+        const std::string path = folder + '/' + name;
+        if (i < DIFFERENT_TITLES) {
+            Archive archive = title(path, FOLDER_TITLE_CHARACTERS, 48, texts);
+            parser.writeOneTitle(&archive);
+        } else {
+            copyTitle(folder, nameOf(i % DIFFERENT_TITLES), name);
+        }
         ArchiveOrder row;
         row.setArchiveIndex(i);
         row.setArchivePath(name);
         rows.push_back(row);
-        paths.push_back(archive.getPath());
+        paths.push_back(path);
     }
     parser.writeFileOrderInFolder(folder, rows);
     return paths;
@@ -122,10 +149,44 @@ std::vector<std::string> BenchTitles::writeFolder(const std::string& folder, int
 std::vector<std::string> BenchTitles::writeIllustratedFolder(const std::string& folder, int count, int texts)
 {
     std::vector<std::string> paths = writeFolder(folder, count, texts);
-    const QImage picture = photograph(SMALL_PICTURE);
-    for (const std::string& path : paths)
-        picture.save(QString::fromStdString(path.substr(0, path.size() - EXTENSION) + "_240.png"));
+    const auto pictureOf = [](const std::string& path) {
+        return QString::fromStdString(path.substr(0, path.size() - EXTENSION) + "_240.png");
+    };
+    if (paths.empty())
+        return paths;
+    const QString first = pictureOf(paths.front());
+    photograph(SMALL_PICTURE).save(first);
+    for (std::size_t i = 1; i < paths.size(); ++i)
+        QFile::copy(first, pictureOf(paths[i]));
     return paths;
+}
+
+void BenchTitles::illustrate(Archive& title, const QImage& background)
+{
+    constexpr QSize CANVAS(1280, 720);
+    const QString stem =
+        QString::fromStdString(title.getPath().substr(0, title.getPath().size() - EXTENSION));
+    const auto savePicture = [&](const char* suffix, QSize size) {
+        const QString path = stem + QLatin1String(suffix);
+        background.copy(QRect(QPoint(), size)).save(path);
+        return QFileInfo(path).fileName().toStdString();
+    };
+    title.setBgResource(savePicture("_source_1280.png", CANVAS));
+    title.setBgResourceBig(savePicture("_source_1920.png", background.size()));
+    savePicture("_1920.png", background.size());
+    savePicture("_960.png", background.size() / 2);
+    savePicture("_240.png", SMALL_PICTURE);
+    savePicture("_240S.png", SMALL_PICTURE);
+}
+
+void BenchTitles::writeChecker()
+{
+    const QString folder =
+        qEnvironmentVariable("K2SYS_AC_DATA") + QStringLiteral("/defaultuser/resources/Templates");
+    QDir().mkpath(folder);
+    QImage checker(SMALL_PICTURE, QImage::Format_RGB32);
+    checker.fill(Qt::gray);
+    checker.save(folder + QStringLiteral("/checker_240x135.png"));
 }
 
 QImage BenchTitles::photograph(QSize size)

@@ -23,6 +23,12 @@ public:
     };
 
     static constexpr int TEXTS = 4;
+    static constexpr int MOST_CHARACTERS = 300; // that the program allows in a text
+    // Returns how many texts of at most MOST_CHARACTERS have this many characters together.
+    static constexpr int textsFor(long characters)
+    {
+        return static_cast<int>((characters + MOST_CHARACTERS - 1) / MOST_CHARACTERS);
+    }
 
     static std::unique_ptr<TText> text(int id, float x, float y, const Look& look);
     // Returns a title without a background. path is that of the title file; the names of the pictures are
@@ -35,6 +41,13 @@ public:
     // Writes the same titles with a small picture for each.
     static std::vector<std::string> writeIllustratedFolder(const std::string& folder, int count,
                                                            int texts = TEXTS);
+
+    // Gives a title a background of 1920x1080 pixels and writes it beside the title, with the smaller
+    // pictures that a title has.
+    static void illustrate(Archive& title, const QImage& background);
+
+    // Writes the pattern behind small pictures to the data path.
+    static void writeChecker();
 
     // Returns a picture that compresses as badly as a photograph.
     static QImage photograph(QSize size);

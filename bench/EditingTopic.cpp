@@ -18,12 +18,14 @@
 #include <QTextCursor>
 #include <QTextDocument>
 #include <QUndoStack>
+#include <algorithm>
 
 namespace
 {
 
 constexpr double DRAG_AIM = 4.0;
-constexpr double STYLE_AIM = 3.0;
+constexpr double STYLE_AIM = 1.6;
+constexpr double STYLE_EXPONENT = 1.1;
 constexpr int CHARACTERS = 300;
 constexpr int STEP = 6; // pixels that the finger moves in one frame
 constexpr int OBJECT = 1;
@@ -59,17 +61,20 @@ void mouse(QGraphicsView& view, QEvent::Type type, QPoint point)
 // The object on the canvas with its undo stack, as in the window. It is not part of a title, so undo steps
 // are not saved: another pair measures saving.
 struct Canvas {
-    explicit Canvas(const BenchTitles::Look& look)
+    // The text under test, and others that are only shown.
+    explicit Canvas(const BenchTitles::Look& look, int texts = 1)
     {
         scene.setSceneRect(QRectF(QPointF(0, 0), CANVAS));
         view.setScene(&scene);
         prepare(view);
         QObject::connect(&scene, &CanvasScene::signalPushUndoCommandIntoStack, &stack,
                          [this](QUndoCommand* command) { stack.push(command); });
-        const std::unique_ptr<TText> record = BenchTitles::text(OBJECT, 100, 60, look);
-        TText lastAlpha;
-        lastAlpha.setTextItems({new TextStyle(*record->textItems().front())});
-        text = scene.rebuildItem(record.get(), lastAlpha);
+        for (int id = OBJECT + texts - 1; id >= OBJECT; --id) {
+            const std::unique_ptr<TText> record = BenchTitles::text(id, 100, 60, look);
+            TText lastAlpha;
+            lastAlpha.setTextItems({new TextStyle(*record->textItems().front())});
+            text = scene.rebuildItem(record.get(), lastAlpha);
+        }
     }
 
     QUndoStack stack;
@@ -146,9 +151,9 @@ void selectAll(GraphicsText& text)
     text.getSelectionInfo(0, 0, 0, 2);
 }
 
-void changeStyle(benchmark::State& state)
+void changeStyle(benchmark::State& state, const BenchTitles::Look& look, int texts)
 {
-    Canvas canvas(PLAIN_TEXT);
+    Canvas canvas(look, texts);
     canvas.stack.setUndoLimit(25);
     selectAll(*canvas.text);
     TText sources[] = {withBold(*canvas.text->getItemTText(), true),
@@ -233,8 +238,19 @@ void setPlainText(benchmark::State& state)
 void Topics::addEditing(PairList& list)
 {
     list.add({"drag_frame", DRAG_AIM, PairList::Clock::Cpu}, benchmark::kMillisecond, dragText, dragPixmap);
-    list.add({"style_change", STYLE_AIM, PairList::Clock::Cpu}, benchmark::kMillisecond, changeStyle,
-             setPlainText);
+    list.add(
+        {"style_change", STYLE_AIM, PairList::Clock::Cpu}, benchmark::kMillisecond,
+        [](benchmark::State& state) { changeStyle(state, PLAIN_TEXT, 1); }, setPlainText);
     list.add({"style_undo", STYLE_AIM, PairList::Clock::Cpu}, benchmark::kMillisecond, undoStyle,
              setPlainText);
+    list.addGrowth({"style_change_of_characters",
+                    STYLE_EXPONENT,
+                    PairList::Clock::Cpu,
+                    {10, CHARACTERS, 1200},
+                    "characters"},
+                   benchmark::kMillisecond, [](benchmark::State& state, long characters) {
+                       BenchTitles::Look look = PLAIN_TEXT;
+                       look.characters = static_cast<int>(std::min<long>(characters, CHARACTERS));
+                       changeStyle(state, look, BenchTitles::textsFor(characters));
+                   });
 }

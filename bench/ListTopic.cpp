@@ -1,10 +1,13 @@
 // The title list: one step of a flick, filling it, a tap on a title and opening a folder.
+#include "bench/BareFiles.h"
 #include "bench/BenchEnvironment.h"
 #include "bench/BenchTitles.h"
 #include "bench/PairList.h"
+#include "bench/PlainTitle.h"
 #include "bench/ShownList.h"
 #include "bench/TitleEditor.h"
 #include "bench/Topics.h"
+#include "canvas/TextObjectConstants.h"
 #include "document/ArchiveController.h"
 #include "library/ArchiveItem.h"
 #include "library/ArchiveList.h"
@@ -12,56 +15,62 @@
 #include <QApplication>
 #include <QDir>
 #include <QFileInfo>
-#include <QImageReader>
+#include <QGraphicsScene>
+#include <QGraphicsTextItem>
+#include <QGraphicsView>
 #include <QLabel>
 #include <QMouseEvent>
 #include <QPainter>
+#include <QPixmap>
 #include <QPushButton>
 #include <QScrollArea>
 #include <QScrollBar>
 #include <QVBoxLayout>
+#include <array>
+#include <map>
 #include <memory>
+#include <string>
 #include <vector>
 
 namespace
 {
 
-constexpr double FLICK_AIM = 1.3;
+constexpr double FLICK_AIM = 2.0;
 constexpr double BUILD_AIM = 2.0;
-constexpr double TAP_AIM = 1.5;
-constexpr double OPEN_AIM = 1.5;
-constexpr double FIRST_SCREEN_AIM = 0.15;
-constexpr double LONG_FIRST_SCREEN_AIM = 1.5;
+constexpr double TAP_LIMIT = 4; // milliseconds
+constexpr double OPEN_AIM = 1.3;
+constexpr double FIRST_SCREEN_AIM = 1.5;
+constexpr double LONG_FIRST_SCREEN_LIMIT = 60; // milliseconds
+constexpr double FIRST_SCREEN_EXPONENT = 0.5;
 constexpr int TITLES = 99;
 constexpr int LONG_TITLES = 998;
 constexpr int TICK_PIXELS = 24; // of a fast flick
 constexpr int CHARACTERS = 100;
+constexpr int CHARACTER_SIZE = 36;
+
+// Returns a folder of this many titles, which is made when it is asked for first.
+QString folderOf(const BenchEnvironment& environment, long titles)
+{
+    static std::map<long, QString> made;
+    QString& path = made[titles];
+    if (path.isEmpty()) {
+        path = environment.makeFolder(QStringLiteral("list%1").arg(titles));
+        BenchTitles::writeIllustratedFolder(path.toStdString(), static_cast<int>(titles));
+    }
+    return path;
+}
 
 QString titleFolder(const BenchEnvironment& environment)
 {
-    static const QString folder = [&environment] {
-        const QString path = environment.makeFolder(QStringLiteral("list"));
-        BenchTitles::writeIllustratedFolder(path.toStdString(), TITLES);
-        return path;
-    }();
-    return folder;
+    return folderOf(environment, TITLES);
 }
 
-QString longFolder(const BenchEnvironment& environment)
+std::vector<std::string> filesOf(const QString& folder, const char* pattern)
 {
-    static const QString folder = [&environment] {
-        const QString path = environment.makeFolder(QStringLiteral("long"));
-        BenchTitles::writeIllustratedFolder(path.toStdString(), LONG_TITLES);
-        return path;
-    }();
-    return folder;
-}
-
-QStringList smallPictures(const QString& folder)
-{
-    QStringList paths;
-    for (const QString& name : QDir(folder).entryList({QStringLiteral("*_240.png")}, QDir::Files, QDir::Name))
-        paths.append(folder + QLatin1Char('/') + name);
+    std::vector<std::string> paths;
+    for (const QFileInfo& file :
+         QDir(folder).entryInfoList({QLatin1String(pattern)}, QDir::Files, QDir::Name))
+        paths.push_back(file.filePath().toStdString());
     return paths;
 }
 
@@ -165,7 +174,7 @@ QString twoTitles(const BenchEnvironment& environment)
     BenchTitles::writeFolder(folder.toStdString(), 2);
     ArchiveController controller;
     for (const QFileInfo& file : QDir(folder).entryInfoList({QStringLiteral("*.xml")}, QDir::Files)) {
-        Archive title = BenchTitles::title(file.filePath().toStdString(), CHARACTERS, 36);
+        Archive title = BenchTitles::title(file.filePath().toStdString(), CHARACTERS, CHARACTER_SIZE);
         controller.saveNewArchive(folder, &title);
     }
     return folder;
@@ -191,6 +200,8 @@ void tapTitle(benchmark::State& state, const BenchEnvironment& environment)
 {
     TitleEditor editor(twoTitles(environment), nullptr);
     int row = 0;
+    for (const int first : {1, 0})
+        tap(editor, first); // other pairs have taken the place of their glyphs
     for ([[maybe_unused]] auto _ : state) {
         row = 1 - row;
         tap(editor, row);
@@ -199,18 +210,46 @@ void tapTitle(benchmark::State& state, const BenchEnvironment& environment)
         state.SkipWithError("the title was not selected");
 }
 
-// Measures the floor: draws all texts once.
-void renderTitle(benchmark::State& state, const BenchEnvironment& environment)
+// Measures the floor: gives four text items of Qt the texts of the other title, and two pictures of a list
+// their frames, until all is painted.
+void showPlainTitle(benchmark::State& state, const BenchEnvironment& environment)
 {
-    TitleEditor editor(twoTitles(environment), nullptr);
-    if (!isComplete(editor))
-        state.SkipWithError("the title does not show");
-    QImage picture(TitleEditor::CANVAS, QImage::Format_ARGB32_Premultiplied);
+    std::vector<PlainTitle> titles;
+    for (const std::string& path : filesOf(twoTitles(environment), "*.xml"))
+        titles.emplace_back(BenchTitles::title(path, CHARACTERS, CHARACTER_SIZE),
+                            TextObjectConstants::SCENEPERCENTAGE);
+    QGraphicsScene scene(QRectF(QPointF(0, 0), TitleEditor::CANVAS));
+    std::vector<QGraphicsTextItem*> items;
+    for (std::size_t i = 0; i < titles.front().count(); ++i) {
+        items.push_back(scene.addText({}));
+        items.back()->setPos(titles.front().position(i));
+    }
+    QGraphicsView view(&scene);
+    view.setRenderHint(QPainter::Antialiasing);
+    view.setFrameShape(QFrame::NoFrame);
+    view.resize(TitleEditor::CANVAS);
+    view.show();
+    QWidget list;
+    auto* column = new QVBoxLayout(&list);
+    QPixmap picture(ArchiveItem::WIDGET_WIDTH, ArchiveItem::WIDGET_HEIGHT);
+    picture.fill(Qt::gray);
+    std::array<QLabel*, 2> rows{};
+    for (QLabel*& row : rows) {
+        row = new QLabel(&list);
+        row->setPixmap(picture);
+        row->setFrameShape(QFrame::Box);
+        column->addWidget(row);
+    }
+    list.show();
+    std::size_t shown = 0;
     for ([[maybe_unused]] auto _ : state) {
-        picture.fill(Qt::transparent);
-        QPainter painter(&picture);
-        painter.setRenderHint(QPainter::Antialiasing);
-        editor.scene.render(&painter);
+        shown = 1 - shown;
+        for (std::size_t i = 0; i < items.size(); ++i)
+            titles[shown].fill(*items[i]->document(), i);
+        for (std::size_t i = 0; i < rows.size(); ++i)
+            rows[i]->setLineWidth(i == shown ? 2 : 1);
+        ShownList::show(list);
+        ShownList::show(*view.viewport());
     }
 }
 
@@ -270,11 +309,21 @@ void openFirstScreen(benchmark::State& state, const QString& folder)
     }
 }
 
-void decodePictures(benchmark::State& state, const QStringList& paths)
+void readTitles(benchmark::State& state, const QString& folder)
 {
+    const std::vector<std::string> titles = filesOf(folder, "*.xml");
     for ([[maybe_unused]] auto _ : state)
-        for (const QString& path : paths)
-            benchmark::DoNotOptimize(QImageReader(path).read());
+        if (!BareFiles::load(titles))
+            state.SkipWithError("a title cannot be read");
+}
+
+void readTitlesAndPictures(benchmark::State& state, const QString& folder)
+{
+    const std::vector<std::string> titles = filesOf(folder, "*.xml");
+    const std::vector<std::string> pictures = filesOf(folder, "*_240.png");
+    for ([[maybe_unused]] auto _ : state)
+        if (!BareFiles::load(titles) || !BareFiles::decode(pictures))
+            state.SkipWithError("a file cannot be read");
 }
 
 } // namespace
@@ -288,19 +337,28 @@ void Topics::addList(PairList& list, const BenchEnvironment& environment)
         [place](benchmark::State& state) { scrollBareArea(state, titleFolder(*place)); });
     list.add({"list_fill", BUILD_AIM, PairList::Clock::Cpu}, benchmark::kMillisecond, fillList, fillBareArea);
     list.add(
-        {"title_tap", TAP_AIM, PairList::Clock::Cpu}, benchmark::kMillisecond,
+        {"title_tap", 0, PairList::Clock::Cpu, TAP_LIMIT}, benchmark::kMillisecond,
         [place](benchmark::State& state) { tapTitle(state, *place); },
-        [place](benchmark::State& state) { renderTitle(state, *place); });
+        [place](benchmark::State& state) { showPlainTitle(state, *place); });
     list.add(
         {"folder_open", OPEN_AIM, PairList::Clock::Wall}, benchmark::kMillisecond,
         [place](benchmark::State& state) { openFolder(state, titleFolder(*place)); },
-        [place](benchmark::State& state) { decodePictures(state, smallPictures(titleFolder(*place))); });
+        [place](benchmark::State& state) { readTitlesAndPictures(state, titleFolder(*place)); });
     list.add(
         {"folder_first_screen", FIRST_SCREEN_AIM, PairList::Clock::Wall}, benchmark::kMillisecond,
         [place](benchmark::State& state) { openFirstScreen(state, titleFolder(*place)); },
-        [place](benchmark::State& state) { openFolder(state, titleFolder(*place)); });
+        [place](benchmark::State& state) { readTitles(state, titleFolder(*place)); });
     list.add(
-        {"long_folder_first_screen", LONG_FIRST_SCREEN_AIM, PairList::Clock::Wall}, benchmark::kMillisecond,
-        [place](benchmark::State& state) { openFirstScreen(state, longFolder(*place)); },
-        [place](benchmark::State& state) { openFirstScreen(state, titleFolder(*place)); });
+        {"long_folder_first_screen", 0, PairList::Clock::Wall, LONG_FIRST_SCREEN_LIMIT},
+        benchmark::kMillisecond,
+        [place](benchmark::State& state) { openFirstScreen(state, folderOf(*place, LONG_TITLES)); },
+        [place](benchmark::State& state) { readTitles(state, titleFolder(*place)); });
+    list.addGrowth({"first_screen_of_titles",
+                    FIRST_SCREEN_EXPONENT,
+                    PairList::Clock::Wall,
+                    {10, TITLES, LONG_TITLES, 9998},
+                    "titles"},
+                   benchmark::kMillisecond, [place](benchmark::State& state, long titles) {
+                       openFirstScreen(state, folderOf(*place, titles));
+                   });
 }

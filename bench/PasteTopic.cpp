@@ -3,12 +3,13 @@
 #include "bench/BenchEnvironment.h"
 #include "bench/BenchTitles.h"
 #include "bench/PairList.h"
+#include "bench/PlainTitle.h"
 #include "bench/TitleEditor.h"
 #include "bench/Topics.h"
+#include "canvas/TextObjectConstants.h"
 #include "document/ArchiveController.h"
 #include "document/ITitleChangeReporter.h"
 #include "library/ArchiveAction.h"
-#include "library/ArchiveItem.h"
 #include "library/ThumbnailRender.h"
 #include "support/FileSyncQueue.h"
 
@@ -17,7 +18,6 @@
 #include <QElapsedTimer>
 #include <QFile>
 #include <QFileInfo>
-#include <QPainter>
 #include <algorithm>
 #include <atomic>
 #include <chrono>
@@ -33,25 +33,6 @@ constexpr int CHARACTERS = 40;
 constexpr int CHARACTER_SIZE = 48;
 const QSize AIR(1920, 1080);
 
-// Gives the title at path all its pictures, with the photograph as its background.
-void illustrate(const QString& folder, const std::string& path, const QImage& photograph)
-{
-    const QString stem =
-        folder + QLatin1Char('/') + QFileInfo(QString::fromStdString(path)).completeBaseName();
-    const auto savePicture = [&stem, &photograph](const QString& end, QSize size) {
-        photograph.copy(QRect(QPoint(), size)).save(stem + end);
-        return QFileInfo(stem + end).fileName().toStdString();
-    };
-    Archive title = BenchTitles::title(path, CHARACTERS, CHARACTER_SIZE);
-    title.setBgResource(savePicture(QStringLiteral("_source_1280.png"), TitleEditor::CANVAS));
-    title.setBgResourceBig(savePicture(QStringLiteral("_source_1920.png"), AIR));
-    savePicture(QStringLiteral("_1920.png"), AIR);
-    savePicture(QStringLiteral("_960.png"), AIR / 2);
-    savePicture(QStringLiteral("_240.png"), AIR / 8);
-    savePicture(QStringLiteral("_240S.png"), AIR / 8);
-    ArchiveController().saveNewArchive(folder, &title);
-}
-
 // Makes a folder of two titles with different photographs.
 QString photographFolder(const BenchEnvironment& environment)
 {
@@ -59,7 +40,9 @@ QString photographFolder(const BenchEnvironment& environment)
         const QString path = environment.makeFolder(QStringLiteral("paste"));
         QImage photograph = BenchTitles::photograph(AIR);
         for (const std::string& title : BenchTitles::writeFolder(path.toStdString(), 2)) {
-            illustrate(path, title, photograph);
+            Archive archive = BenchTitles::title(title, CHARACTERS, CHARACTER_SIZE);
+            BenchTitles::illustrate(archive, photograph);
+            ArchiveController().saveNewArchive(path, &archive);
             photograph.mirror();
         }
         return path;
@@ -131,25 +114,23 @@ void pasteTitle(benchmark::State& state, const BenchEnvironment& environment)
     }
 }
 
-// Measures the floor: copies the files of the title and draws its scene once.
+// Measures the floor: copies the files of the title, and lays out and draws its texts over its background.
 void copyAndDraw(benchmark::State& state, const BenchEnvironment& environment)
 {
     const QString folder = photographFolder(environment);
-    TitleEditor editor(folder, nullptr);
-    const QFileInfo title(editor.shown.list.archiveItem(0)->getArchiveDataPath());
+    const QFileInfo title(QDir(folder).entryInfoList({QStringLiteral("*.xml")}, QDir::Files).constFirst());
     const QFileInfoList files =
         QDir(folder).entryInfoList({title.completeBaseName() + QLatin1Char('*')}, QDir::Files);
     const QString target = environment.makeFolder(QStringLiteral("copies")) + QLatin1Char('/');
-    QImage picture(TitleEditor::CANVAS, QImage::Format_ARGB32_Premultiplied);
+    const PlainTitle texts(BenchTitles::title(title.filePath().toStdString(), CHARACTERS, CHARACTER_SIZE),
+                           TextObjectConstants::SCENEPERCENTAGE);
+    const QImage background = BenchTitles::photograph(TitleEditor::CANVAS);
     for ([[maybe_unused]] auto _ : state) {
         QElapsedTimer time;
         time.start();
         for (const QFileInfo& file : files)
             QFile::copy(file.filePath(), target + file.fileName());
-        picture.fill(Qt::transparent);
-        QPainter painter(&picture);
-        painter.setRenderHint(QPainter::Antialiasing);
-        editor.scene.render(&painter);
+        benchmark::DoNotOptimize(texts.draw(TitleEditor::CANVAS, background));
         state.SetIterationTime(static_cast<double>(time.nsecsElapsed()) / NANOSECONDS);
         for (const QFileInfo& file : files)
             QFile::remove(target + file.fileName());

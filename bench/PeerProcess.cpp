@@ -6,7 +6,7 @@
 
 namespace
 {
-constexpr int START_TIME = 10000; // milliseconds
+constexpr int START_TIME = 60000; // milliseconds
 }
 
 PeerProcess::PeerProcess()
@@ -50,6 +50,18 @@ bool PeerProcess::awaitLine(const QByteArray& text)
         if (!m_process.waitForReadyRead(static_cast<int>(deadline.remainingTime())))
             return false;
     }
+}
+
+QByteArray PeerProcess::ask(const QByteArray& line)
+{
+    m_process.write(line);
+    QByteArray read;
+    while (!read.endsWith('\n')) {
+        if (!m_process.waitForReadyRead(START_TIME))
+            return {};
+        read += m_process.readAllStandardOutput();
+    }
+    return read.chopped(1);
 }
 
 bool PeerProcess::start(const QString& program, const QStringList& arguments)

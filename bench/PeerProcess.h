@@ -21,6 +21,9 @@ public:
     // Waits for a line of the process that contains the text; discards the lines before it. Returns false
     // when it does not come.
     bool awaitLine(const QByteArray& text);
+    // Writes a line to the process and returns the line that it answers, without its end; empty when none
+    // comes.
+    QByteArray ask(const QByteArray& line);
     // Starts a program and discards its output. Returns false when it cannot be started.
     bool start(const QString& program, const QStringList& arguments = {});
     // Waits for the end of the process. Returns whether it ended by itself with exit code 0.

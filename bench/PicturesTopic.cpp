@@ -1,5 +1,6 @@
 // The four picture files of a title, compared with encoding the same pictures as fast as the libraries
 // available can.
+#include "bench/BareFiles.h"
 #include "bench/BenchEnvironment.h"
 #include "bench/BenchTitles.h"
 #include "bench/FastPng.h"
@@ -9,13 +10,10 @@
 #include "document/PngWriter.h"
 #include "library/PictureThread.h"
 #include "library/ThumbnailRender.h"
-#include "support/AtomicFile.h"
 
-#include <QDir>
 #include <QPainter>
 #include <QThread>
 #include <array>
-#include <future>
 #include <memory>
 #include <string>
 #include <vector>
@@ -39,16 +37,6 @@ struct Job {
         return QString::fromStdString(archive.getPath()).chopped(4) + QLatin1String(suffix);
     }
 };
-
-void writeChecker()
-{
-    const QString folder =
-        qEnvironmentVariable("K2SYS_AC_DATA") + QStringLiteral("/defaultuser/resources/Templates");
-    QDir().mkpath(folder);
-    QImage checker(PictureThread::THUMBNAIL_SMALL_SIZE, QImage::Format_RGB32);
-    checker.fill(Qt::gray);
-    checker.save(folder + QStringLiteral("/checker_240x135.png"));
-}
 
 Job makeJob(const std::string& path, const QImage& background)
 {
@@ -116,39 +104,33 @@ void savePictures(benchmark::State& state, const Job& job)
         runThread(thread, job);
 }
 
-// Encodes and writes the pictures from first up to last.
-bool writePictures(const Job& job, const std::vector<QImage>& images,
-                   std::vector<std::unique_ptr<FastPng>>& pngs, std::size_t first, std::size_t last)
-{
-    for (std::size_t i = first; i < last; ++i) {
-        const QByteArray bytes = pngs[i]->encode(images[i]);
-        if (!AtomicFile::write(job.path(SUFFIXES[i]).toStdString(),
-                               {bytes.constData(), static_cast<std::size_t>(bytes.size())},
-                               AtomicFile::Durability::SyncLater))
-            return false;
-    }
-    return true;
-}
+using Encoders = std::vector<std::unique_ptr<FastPng>>;
 
-void encodePictures(benchmark::State& state, const Job& job)
+// Prepares the fastest encoder for each picture, once.
+void prepare(Encoders& encoders, const Job& job)
 {
+    if (!encoders.empty())
+        return;
     PictureThread thread;
     runThread(thread, job);
-    std::vector<QImage> images = {job.images.at(0), job.images.at(1)};
-    for (std::size_t i = images.size(); i < SUFFIXES.size(); ++i)
-        images.emplace_back(job.path(SUFFIXES[i]));
-    std::vector<std::unique_ptr<FastPng>> pngs;
-    for (const QImage& image : images)
-        pngs.push_back(FastPng::fastestFor(image));
-    for ([[maybe_unused]] auto _ : state) {
-        // The big picture takes longer than the others together.
-        auto big = std::async(std::launch::async, [&] { return writePictures(job, images, pngs, 0, 1); });
-        if (!writePictures(job, images, pngs, 1, images.size()) || !big.get())
-            state.SkipWithError("a file cannot be written");
+    for (std::size_t i = 0; i < SUFFIXES.size(); ++i) {
+        const bool isDrawn = i < static_cast<std::size_t>(job.images.size());
+        const QImage image =
+            isDrawn ? job.images.at(static_cast<qsizetype>(i)) : QImage(job.path(SUFFIXES[i]));
+        encoders.push_back(FastPng::fastestFor(image, isDrawn ? BareFiles::processors() : 1));
     }
-    for (std::size_t i = 0; i < images.size(); ++i) {
+}
+
+void encodePictures(benchmark::State& state, const Job& job, Encoders& encoders)
+{
+    prepare(encoders, job);
+    for ([[maybe_unused]] auto _ : state)
+        for (std::size_t i = 0; i < encoders.size(); ++i)
+            if (!BareFiles::write(job.path(SUFFIXES[i]), encoders[i]->encode()))
+                state.SkipWithError("a file cannot be written");
+    for (std::size_t i = 0; i < encoders.size(); ++i) {
         const QImage read(job.path(SUFFIXES[i]));
-        if (read != images[i].convertToFormat(read.format()))
+        if (read != encoders[i]->image().convertToFormat(read.format()))
             state.SkipWithError("the floor is not lossless");
     }
 }
@@ -164,13 +146,13 @@ void encodeBig(benchmark::State& state, const Job& job)
         state.SkipWithError("the pixels of the file are not those of the picture");
 }
 
-void encodeBigFast(benchmark::State& state, const Job& job)
+void encodeBigFast(benchmark::State& state, const Job& job, Encoders& encoders)
 {
+    prepare(encoders, job);
     const QImage& big = job.images.at(0);
-    const std::unique_ptr<FastPng> png = FastPng::fastestFor(big);
     QByteArray file;
     for ([[maybe_unused]] auto _ : state)
-        file = png->encode(big);
+        file = encoders.front()->encode();
     state.counters["kB"] = static_cast<double>(file.size()) / 1000;
     if (QImage::fromData(file) != big.convertToFormat(QImage::Format_ARGB32))
         state.SkipWithError("the floor is not lossless");
@@ -180,19 +162,28 @@ void encodeBigFast(benchmark::State& state, const Job& job)
 
 void Topics::addPictures(PairList& list, const BenchEnvironment& environment)
 {
-    writeChecker();
+    BenchTitles::writeChecker();
     const std::string folder = environment.makeFolder(QStringLiteral("pictures")).toStdString();
-    const auto add = [&](const std::string& kind, double encodingAim, const QImage& background) {
-        const Job job = makeJob(folder + '/' + kind + ".xml", background);
+    const auto add = [&](const std::string& kind, double encodingAim, bool isPhotograph) {
+        const auto kept = std::make_shared<Job>();
+        // Made when it is measured first.
+        const auto job = [kept, path = folder + '/' + kind + ".xml", isPhotograph]() -> const Job& {
+            if (kept->images.isEmpty())
+                *kept =
+                    makeJob(path, isPhotograph ? BenchTitles::photograph(ThumbnailRender::THUMBNAIL_BIG_SIZE)
+                                               : QImage());
+            return *kept;
+        };
+        const auto encoders = std::make_shared<Encoders>();
         list.add(
             {"pictures_" + kind, AIM, PairList::Clock::Wall}, benchmark::kMillisecond,
-            [job](benchmark::State& state) { savePictures(state, job); },
-            [job](benchmark::State& state) { encodePictures(state, job); });
+            [job](benchmark::State& state) { savePictures(state, job()); },
+            [job, encoders](benchmark::State& state) { encodePictures(state, job(), *encoders); });
         list.add(
             {"encode_" + kind, encodingAim, PairList::Clock::Process}, benchmark::kMillisecond,
-            [job](benchmark::State& state) { encodeBig(state, job); },
-            [job](benchmark::State& state) { encodeBigFast(state, job); });
+            [job](benchmark::State& state) { encodeBig(state, job()); },
+            [job, encoders](benchmark::State& state) { encodeBigFast(state, job(), *encoders); });
     };
-    add("transparent", TRANSPARENT_AIM, {});
-    add("photograph", PHOTOGRAPH_AIM, BenchTitles::photograph(ThumbnailRender::THUMBNAIL_BIG_SIZE));
+    add("transparent", TRANSPARENT_AIM, false);
+    add("photograph", PHOTOGRAPH_AIM, true);
 }

@@ -175,6 +175,6 @@ void Topics::addStart(PairList& list)
 {
     list.add({"start_to_listening", AIM, PairList::Clock::Wall}, benchmark::kMillisecond, startTitler,
              startBareWindow);
-    list.add({"first_answer", ANSWER_AIM, PairList::Clock::Step}, benchmark::kMillisecond, answerFirstRequest,
-             showBareWindow);
+    list.add({"first_answer", ANSWER_AIM, PairList::Clock::Children}, benchmark::kMillisecond,
+             answerFirstRequest, showBareWindow);
 }

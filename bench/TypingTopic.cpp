@@ -14,12 +14,19 @@
 #include <QKeyEvent>
 #include <QTextCursor>
 #include <QTextDocument>
+#include <algorithm>
+#include <memory>
+#include <utility>
+#include <vector>
 
 namespace
 {
 
-constexpr double AIM = 3.0;
+constexpr double AIM = 2.0;
+constexpr double EXPONENT = 0.5;
 constexpr int CHARACTERS = 299;
+constexpr int CHARACTER_SIZE = 48;
+constexpr int SMALL_SIZE = 20; // 1,200 characters of it fit on the canvas
 const QSize CANVAS(1280, 720);
 
 void key(QGraphicsView& view, Qt::Key code, const QString& text)
@@ -68,17 +75,22 @@ void typeKeys(benchmark::State& state, QGraphicsView& view, const QTextDocument&
     }
 }
 
-std::unique_ptr<TText> makeText()
+std::unique_ptr<TText> makeText(int characters, int size, int id = 1)
 {
-    return BenchTitles::text(1, 10, 10,
-                             {.characters = CHARACTERS, .size = 48, .edgeWidth = 0, .shadow = false});
+    constexpr float LINES = 170; // pixels of the canvas, from one text to the next
+    return BenchTitles::text(id, 10, 10 + LINES * static_cast<float>(id - 1),
+                             {.characters = characters, .size = size, .edgeWidth = 0, .shadow = false});
 }
 
-void typeOnCanvas(benchmark::State& state)
+// Types at the end of the first of several equal texts.
+void typeOnCanvas(benchmark::State& state, int characters, int size, int texts)
 {
     Archive archive;
     archive.setPath("unsaved.xml");
-    archive.setText({makeText().release()});
+    std::vector<TText*> records;
+    for (int id = 1; id <= texts; ++id)
+        records.push_back(makeText(characters, size, id).release());
+    archive.setText(std::move(records));
     CanvasScene scene(nullptr);
     scene.setSceneRect(QRectF(QPointF(0, 0), CANVAS));
     GraphicsView view(&scene);
@@ -97,7 +109,7 @@ void typeOnCanvas(benchmark::State& state)
 
 void typeInPlainItem(benchmark::State& state)
 {
-    const std::unique_ptr<TText> record = makeText();
+    const std::unique_ptr<TText> record = makeText(CHARACTERS, CHARACTER_SIZE);
     QGraphicsScene scene(QRectF(QPointF(0, 0), CANVAS));
     auto* item = new QGraphicsTextItem;
     QTextCursor cursor(item->document());
@@ -123,6 +135,13 @@ void typeInPlainItem(benchmark::State& state)
 
 void Topics::addTyping(PairList& list)
 {
-    list.add({"key_to_repaint", AIM, PairList::Clock::Cpu}, benchmark::kMicrosecond, typeOnCanvas,
-             typeInPlainItem);
+    list.add(
+        {"key_to_repaint", AIM, PairList::Clock::Cpu}, benchmark::kMicrosecond,
+        [](benchmark::State& state) { typeOnCanvas(state, CHARACTERS, CHARACTER_SIZE, 1); }, typeInPlainItem);
+    list.addGrowth({"key_of_characters", EXPONENT, PairList::Clock::Cpu, {10, 300, 1200}, "characters"},
+                   benchmark::kMicrosecond, [](benchmark::State& state, long characters) {
+                       // One character less than allowed, so that a key has room.
+                       typeOnCanvas(state, static_cast<int>(std::min<long>(characters, CHARACTERS)),
+                                    SMALL_SIZE, BenchTitles::textsFor(characters));
+                   });
 }

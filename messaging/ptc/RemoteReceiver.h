@@ -11,7 +11,8 @@ namespace PTC
 
 struct EventPacket;
 
-// Keeps the receivers of this process by id. Add them before initialize: packets that arrive earlier are dropped.
+// Keeps the receivers of this process by id. Add them before initialize: packets that arrive earlier are
+// dropped.
 class RemoteReceiver : public IRemoteReceiver
 {
 public:

@@ -31,7 +31,7 @@ void requestAtOnce(const std::atomic<bool>& isGivenUp)
     void* instance = nullptr;
     const std::unique_ptr<PTC::Proxy> proxy(ServiceFamilies::createProxy(117, &instance));
     proxy->setSender(&sender);
-    static_cast<ITitler*>(instance)->showTitlerCreate(EM_CREATE);
+    static_cast<ITitler*>(instance)->showTitlerCreate(1);
     sender.finish(std::chrono::steady_clock::now() + std::chrono::seconds(10));
 }
 
