@@ -1,9 +1,7 @@
 // The factory of the titler's side of the wire while it begins to listen.
 #include "Siblings.h"
 #include "app/TitlerToolFactory.h"
-#include "messaging/ptc/Proxy.h"
 #include "messaging/ptc/SocketRemoteSender.h"
-#include "messaging/services/ITitler.h"
 #include "messaging/services/ServiceFamilies.h"
 #include "messaging/services/ServiceTable.h"
 #include "tests/fakes/FakeTitler.h"
@@ -19,7 +17,8 @@
 namespace
 {
 
-constexpr long TITLER_KEY = 4; // the id of the receiver in the titler's process
+constexpr long TITLER_ID = 117; // of the service
+constexpr long TITLER_KEY = 4;  // of the receiver in the titler's process
 
 // Connects to the titler's port as soon as it listens, and sends one request.
 void requestAtOnce(const std::atomic<bool>& isGivenUp)
@@ -28,10 +27,9 @@ void requestAtOnce(const std::atomic<bool>& isGivenUp)
     while (!sender.initialize(ServiceTable::TITLER_CLIENT))
         if (isGivenUp)
             return;
-    void* instance = nullptr;
-    const std::unique_ptr<PTC::Proxy> proxy(ServiceFamilies::createProxy(117, &instance));
-    proxy->setSender(&sender);
-    static_cast<ITitler*>(instance)->showTitlerCreate(1);
+    TitlerRemoteProxy proxy(TITLER_ID);
+    proxy.setSender(&sender);
+    proxy.showTitlerCreate(1);
     sender.finish(std::chrono::steady_clock::now() + std::chrono::seconds(10));
 }
 
@@ -55,7 +53,7 @@ void tst_titlertoolfactory::requestOfTheFirstMomentArrives()
         std::thread sibling(requestAtOnce, std::cref(isGivenUp));
         auto* titler = new FakeTitler;
         TitlerToolFactory factory;
-        factory.RegisterObject(117, titler);
+        factory.RegisterObject(TITLER_ID, titler);
         const bool listens = factory.initialize();
         isGivenUp = !listens;
         sibling.join();
