@@ -211,5 +211,9 @@ ListTable JsonListReader::read(const QByteArray& bytes)
         table.fail(scan.error());
     else if (table.rowCount() == 0)
         table.fail(QStringLiteral("The list is empty"));
+    else if (table.columnCount() == 0)
+        table.fail(QStringLiteral("line %1: The row cannot be used, and no other can: %2")
+                       .arg(table.line(0))
+                       .arg(table.fault(0)));
     return table;
 }

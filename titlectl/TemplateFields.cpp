@@ -73,6 +73,8 @@ private:
             fail(QStringLiteral("The name in \"%1\" is not a text").arg(where));
         else if (name.contains(QLatin1Char('{')) || name.contains(QLatin1Char('}')))
             fail(QStringLiteral("The name \"%1\" has a brace").arg(name));
+        else if (!name.isValidUtf16())
+            fail(QStringLiteral("The name in \"%1\" has half a character").arg(where));
         return name;
     }
 

@@ -194,7 +194,7 @@ private Q_SLOTS:
         for (int round = runLength("TITLER_ROUNDS", 3000); round > 0; --round) {
             QByteArray bytes = "a,b\n";
             for (quint32 count = generator.bounded(60U); count > 0; --count)
-                bytes += SIGNS[generator.bounded(SIGNS.size())];
+                bytes += SIGNS[generator.bounded(int(SIGNS.size()))];
             const ListTable table = read(bytes);
             QVERIFY(!table.hasFailed());
             int last = 1;

@@ -71,6 +71,7 @@ private Q_SLOTS:
         QTest::newRow("nothing") << QByteArray() << "The list is not an array of objects";
         QTest::newRow("object") << QByteArray("{\"a\": 1}") << "The list is not an array of objects";
         QTest::newRow("empty") << QByteArray(" [ ] ") << "The list is empty";
+        QTest::newRow("no object") << QByteArray("[\n5, 6]") << "line 2: The row cannot be used, and no other can: it is";
         QTest::newRow("no end") << QByteArray("[{\"a\": 1}") << "line 1: The row or the list has no end";
         QTest::newRow("no end of a row") << QByteArray("[{\"a\": 1},\n{\"a\"") << "line 2: The row or the list has no end";
         QTest::newRow("text behind") << QByteArray("[{\"a\": 1}]\nx") << "line 2: Text follows the list";
@@ -123,7 +124,7 @@ private Q_SLOTS:
         for (int round = runLength("TITLER_ROUNDS", 3000); round > 0; --round) {
             QByteArray bytes = WHOLE;
             for (quint32 changes = 1 + generator.bounded(4U); changes > 0; --changes)
-                bytes[generator.bounded(bytes.size())] = "\"\\{}[],:\n1a\xFF"[generator.bounded(12)];
+                bytes[generator.bounded(int(bytes.size()))] = "\"\\{}[],:\n1a\xFF"[generator.bounded(12)];
             const ListTable table = JsonListReader::read(bytes);
             for (int row = 1; row < table.rowCount(); ++row)
                 QVERIFY2(table.line(row) >= table.line(row - 1), bytes.toPercentEncoding().constData());

@@ -118,7 +118,7 @@ private Q_SLOTS:
         for (int round = runLength("TITLER_ROUNDS", 3000); round > 0; --round) {
             QByteArray bytes = WHOLE;
             for (quint32 changes = 1 + generator.bounded(3U); changes > 0; --changes)
-                bytes[generator.bounded(bytes.size())] = "\"\\{}[],:\n1a\xFF"[generator.bounded(12)];
+                bytes[generator.bounded(int(bytes.size()))] = "\"\\{}[],:\n1a\xFF"[generator.bounded(12)];
             QString error;
             const TemplateFields fields = TemplateFields::fromJson(bytes, error);
             QVERIFY2(error.isEmpty() || fields == TemplateFields(), bytes.constData());
