@@ -165,7 +165,8 @@ private:
             // Makes half a character at the end visible, which the decoder would keep to itself.
             if (m_isLast && m_encoding == QStringConverter::Utf8)
                 bytes = QByteArrayLiteral("\n");
-            m_text += QString(m_decoder(bytes));
+            const QString text = m_decoder(bytes);
+            m_text += text;
         }
     }
 

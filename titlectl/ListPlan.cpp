@@ -108,7 +108,7 @@ bool ListPlan::planParts(Filling& filling, const QStringList& names)
     for (const QString& name : names) {
         const int column = m_source.table.columnOf(name);
         if (column < 0) {
-            m_error = QStringLiteral("The list has no column \"%1\" for \"{%1}\" in text %2").arg(name).arg(filling.id);
+            m_error = QStringLiteral("The list has no column \"%1\" for \"{%1}\" in text %2").arg(name, QString::number(filling.id));
             return false;
         }
         filling.parts.insert(name, column);
@@ -200,15 +200,11 @@ QString ListPlan::fillText(int row, const Filling& filling, TText& text) const
         return {};
     if (const int count = TextFields::characterCount(text); count > TextObjectConstants::CHARACTER_LIMIT) {
         return QStringLiteral("field \"%1\" has %2 characters, %3 is the limit")
-            .arg(field.name)
-            .arg(count)
-            .arg(TextObjectConstants::CHARACTER_LIMIT);
+            .arg(field.name, QString::number(count), QString::number(TextObjectConstants::CHARACTER_LIMIT));
     }
     if (field.fit && !TextFit::shrink(text, *field.fit)) {
         return QStringLiteral("field \"%1\" is %2 pixels wide at the smallest size, %3 is the limit")
-            .arg(field.name)
-            .arg(int(TextFit::inkWidth(text)))
-            .arg(field.fit->width);
+            .arg(field.name, QString::number(int(TextFit::inkWidth(text))), QString::number(field.fit->width));
     }
     TextFit::keepAlignment(text, before);
     return {};
