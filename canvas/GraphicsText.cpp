@@ -314,6 +314,11 @@ quint64 GraphicsText::contentVersion() const
     return m_painter->contentVersion();
 }
 
+QRectF GraphicsText::inkRect() const
+{
+    return m_painter->inkRect();
+}
+
 void GraphicsText::initNewTextSelectAll()
 {
     m_touchEditor->initNewTextSelectAll();

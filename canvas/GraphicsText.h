@@ -128,6 +128,9 @@ public:
     QGraphicsDropShadowEffect* shadowEffect() const { return m_shadowEffect; }
     // Returns the rectangle of the layout, which does not depend on the bounding rect flag.
     QRectF layoutRect() const { return QGraphicsTextItem::boundingRect(); }
+    // Returns the area that the glyphs and their outlines cover, in item coordinates; empty without ink. Shadows
+    // are not counted.
+    QRectF inkRect() const;
     void parentFollows() override;
 
 public Q_SLOTS:

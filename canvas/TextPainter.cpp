@@ -194,6 +194,39 @@ void TextPainter::drawItemText(QPainter* painter)
     painter->setRenderHint(QPainter::Antialiasing, antialiasing);
 }
 
+QRectF TextPainter::inkOf(const Glyph& glyph)
+{
+    QRectF ink = glyph.path->fill().boundingRect();
+    if (glyph.edge && glyph.edgeWidth > 0)
+        ink |= glyph.path->outline(glyph.edgeWidth).boundingRect();
+    else if (glyph.edge)
+        ink.adjust(-0.5, -0.5, 0.5, 0.5); // a hairline
+    return ink.translated(glyph.baseline);
+}
+
+QRectF TextPainter::inkOf(const Run& run)
+{
+    const QRawFont font = run.glyphs.rawFont();
+    const QList<quint32> indexes = run.glyphs.glyphIndexes();
+    const QList<QPointF> positions = run.glyphs.positions();
+    QRectF ink;
+    for (qsizetype i = 0; i < std::min(indexes.size(), positions.size()); ++i)
+        if (const QRectF glyph = font.boundingRect(indexes[i]); !glyph.isEmpty())
+            ink |= glyph.translated(positions[i]);
+    return ink;
+}
+
+QRectF TextPainter::inkRect()
+{
+    collectGlyphs();
+    QRectF ink;
+    for (const Glyph& glyph : m_glyphs)
+        ink |= inkOf(glyph);
+    for (const Run& run : m_runs)
+        ink |= inkOf(run);
+    return ink;
+}
+
 void TextPainter::drawItemBoundingRect(QPainter* painter, const QRectF& rect, int status)
 {
     prepareFrame(rect);

@@ -41,6 +41,9 @@ public:
     CaretGeometry& carets() { return m_carets; }
 
     void drawItemText(QPainter* painter);
+    // Returns the area that drawItemText() covers with glyphs and outlines, in item coordinates; empty if it draws
+    // nothing.
+    QRectF inkRect();
     // Draws the frame of a pair: status is that of the child, FocusEdit or FocusObject.
     void drawItemBoundingRect(QPainter* painter, const QRectF& rect, int status);
     // Highlights the selection of the cursor; hasFocus chooses the colours.
@@ -83,6 +86,8 @@ private:
         QList<QRectF> dots;
     };
 
+    static QRectF inkOf(const Glyph& glyph);
+    static QRectF inkOf(const Run& run);
     void collectGlyphs();
     void prepareFrame(const QRectF& rect);
     void collectBlock(const QTextBlock& block);
