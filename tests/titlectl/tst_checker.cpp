@@ -98,7 +98,7 @@ void tst_checker::eachFaultAlone_data()
     QTest::addColumn<QString>("file");
     QTest::addColumn<QString>("object");
     const auto row = [](const char* rule, const char* file, const char* object, const Damage& damage) {
-        QTest::addRow("%s %s", rule, object) << damage << QString(rule) << QString(file) << QString(object);
+        QTest::addRow("%s %s %s", rule, file, object) << damage << QString(rule) << QString(file) << QString(object);
     };
     row("order-unreadable", ".order.xml", "", [](const QString& folder) {
         QFile::resize(folder + "/.order.xml", QFileInfo(folder + "/.order.xml").size() / 2);
