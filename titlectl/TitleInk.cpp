@@ -8,6 +8,8 @@
 #include <QGraphicsDropShadowEffect>
 #include <QGraphicsItem>
 #include <QPainter>
+#include <QTextBlock>
+#include <QTextDocument>
 #include <algorithm>
 #include <cstdlib>
 #include <utility>
@@ -48,9 +50,11 @@ TitleInk::Text TitleInk::measure(qsizetype index)
     GraphicsText* item = m_raster.texts().at(index);
     QGraphicsScene& scene = m_raster.scene();
     Text text;
+    // The margins at the sides leave room for the handles of the canvas.
+    const double side = BIG_DOCUMENT_MARGIN + item->document()->begin().blockFormat().leftMargin();
     text.layout = item->layoutRect()
                       .translated(item->scenePos())
-                      .adjusted(BIG_DOCUMENT_MARGIN, BIG_DOCUMENT_MARGIN, -BIG_DOCUMENT_MARGIN, -BIG_DOCUMENT_MARGIN);
+                      .adjusted(side, BIG_DOCUMENT_MARGIN, -side, -BIG_DOCUMENT_MARGIN);
 
     const bool hasShadow = item->shadowEffect()->isEnabled();
     item->shadowEffect()->setEnabled(false);

@@ -3,6 +3,7 @@
 #include "support/FileSyncQueue.h"
 #include "support/OwnerOnlyFiles.h"
 #include "titlectl/CommandTable.h"
+#include "titlectl/ProgramTexts.h"
 #include "titlectl/RenderWorker.h"
 
 #include <QApplication>
@@ -12,6 +13,7 @@
 #include <chrono>
 #include <cstdio>
 #include <iostream>
+#include <optional>
 #include <unistd.h>
 
 namespace
@@ -27,7 +29,7 @@ QStringList wordsOf(int argc, char* argv[])
     return words;
 }
 
-int run(const QStringList& words)
+int run(const CommandTable& table, const QStringList& words)
 {
     if (words == QStringList{RenderWorker::COMMAND}) {
         RenderWorker::serve(std::cin, std::cout);
@@ -37,7 +39,7 @@ int run(const QStringList& words)
     QFile messages;
     result.open(STDOUT_FILENO, QIODevice::WriteOnly | QIODevice::Unbuffered);
     messages.open(STDERR_FILENO, QIODevice::WriteOnly | QIODevice::Unbuffered);
-    return CommandTable().run(words, result, messages, ::isatty(STDERR_FILENO) == 1);
+    return table.run(words, result, messages, ::isatty(STDERR_FILENO) == 1);
 }
 
 } // namespace
@@ -47,10 +49,16 @@ int main(int argc, char* argv[])
     OwnerOnlyFiles::setUmask();
     qputenv("QT_QPA_PLATFORM", "offscreen");
     const QStringList words = wordsOf(argc, argv); // Qt removes those that it understands
+    const CommandTable table;
+    // Texts about the program need neither fonts nor titles.
+    if (const std::optional<QString> text = ProgramTexts(table).textFor(words.value(0))) {
+        std::cout << text->toStdString() << std::flush;
+        return 0;
+    }
     const QApplication application(argc, argv);
     // The font that the titler's window starts from, so that empty lines come out equally high.
     QApplication::setFont(QFont(QStringLiteral("KST-Medium"), 12));
-    const int code = run(words);
+    const int code = run(table, words);
     if (!FileSyncQueue::flush(SYNC_DEADLINE))
         std::fprintf(stderr, "titlectl: the disk has not taken all files yet\n");
     return code;

@@ -1,4 +1,5 @@
 // Changing a text of a title: which styles the characters take, and where it stands afterwards.
+#include "canvas/StyleDocument.h"
 #include "document/TText.h"
 #include "document/TextStyle.h"
 #include "tests/library/LibraryFixture.h"
@@ -14,9 +15,10 @@ namespace
 std::unique_ptr<TText> numbered(const QString& characters)
 {
     std::unique_ptr<TText> text(LibraryFixture::makeText(characters, 1));
-    int size = 40;
-    for (TextStyle* style : text->textItems())
-        style->setFontSize(size++);
+    for (std::size_t i = 0; i < text->textItems().size(); ++i) {
+        text->textItems()[i]->setText(StyleDocument::storedText(characters, qsizetype(i)).toStdString());
+        text->textItems()[i]->setFontSize(40 + int(i));
+    }
     return text;
 }
 
