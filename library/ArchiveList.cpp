@@ -350,7 +350,15 @@ void ArchiveList::giveBackItems()
 
 void ArchiveList::prepareOrder()
 {
+    lockFolder();
     m_cleanUp = m_controller->prepareOrder(m_currentPath) ? CleanUp::Allowed : CleanUp::Withheld;
+}
+
+// Takes the lock of the current folder unless it is held. The operator is not kept waiting for another program
+// that has it: the list goes on and tries again with the next title.
+void ArchiveList::lockFolder()
+{
+    m_folderLock.take(m_currentPath.toStdString(), FolderLock::Kind::Exclusive);
 }
 
 void ArchiveList::setFolderLabel()
@@ -422,6 +430,7 @@ void ArchiveList::saveLastArchivePathAndNotifyCanvasUpdate(ArchiveItem* item)
 {
     if (!item)
         return;
+    lockFolder();
     m_controller->setLastArchivePath(item->getArchiveDataPath());
     Q_EMIT signalUpdateCanvas(item->getArchiveData());
 }
@@ -515,6 +524,7 @@ void ArchiveList::cleanArchiveList()
     endInitThread();
     clearOldArchiveList();
     resetPositions();
+    m_folderLock.release();
     m_currentPath.clear();
     if (m_folderLabel)
         m_folderLabel->clear();

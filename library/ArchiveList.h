@@ -5,6 +5,7 @@
 #include "library/TitleMenuActions.h"
 #include "library/TitleRows.h"
 #include "library/TitleSelection.h"
+#include "support/FolderLock.h"
 #include "touchui/KSScrollViewerWidget.h"
 
 #include <QImage>
@@ -187,6 +188,7 @@ private:
     void resetPositions();
     void setFolderLabel();
     void prepareOrder();
+    void lockFolder();
     bool orderIsDamaged() const;
     void offerTemplateOrReportFull();
     ArchiveItem* findItem(const QString& path) const;
@@ -206,6 +208,7 @@ private:
     enum class CleanUp { Allowed, Withheld };
     CleanUp m_cleanUp = CleanUp::Withheld;
     QString m_currentPath;
+    FolderLock m_folderLock; // of the current folder, against programs that write titles there
     TitleSelection m_selection;
     QPointer<ArchiveItem> m_draggedItem;
     int m_moveSource = -1;   // row of the dragged item

@@ -28,11 +28,7 @@ const QColor ThumbnailRender::DROP_SHADOW_COLOR(0, 0, 0, 255);
 namespace
 {
 
-// Positions are converted from the 1280 canvas to the 1920 raster: times three to 3840, then half of it.
-const double TO_DOUBLE_RASTER = 3.0;
-const double TO_RASTER = 0.5;
 const double CANVAS_RATIO = 2.0 / 3.0;
-const double RASTER_RATIO = 1.0;
 
 // Limits the bounding rectangles to the raster, so that a text far outside it takes no time to paint.
 void limitTextsToRaster(const QGraphicsScene& scene)
@@ -71,10 +67,8 @@ QImage renderScene(QGraphicsScene& scene, QSize size)
 ThumbnailRender::ThumbnailRender(QObject* parent) : IThumbnailRender(parent)
 {
     m_middleScene.setSceneRect(SCENE_RECT_SIZE);
-    m_bigScene.setSceneRect(BIG_SIZE_SCENE_RECT_SIZE);
-    // Each scene is filled, rendered once and cleared, so an index would not pay off.
+    // The scene is filled, rendered once and cleared, so an index would not pay off.
     m_middleScene.setItemIndexMethod(QGraphicsScene::NoIndex);
-    m_bigScene.setItemIndexMethod(QGraphicsScene::NoIndex);
 }
 
 ThumbnailRender::~ThumbnailRender()
@@ -207,34 +201,26 @@ void ThumbnailRender::drawNextBigPicture()
     const QFileInfo title(QString::fromStdString(job->archive->getPath()));
     if (job->hadTitle && !title.exists() && title.dir().exists())
         return; // the title was deleted meanwhile
-    createBigSizeCanvasSceneUsingArchiveData(*job->archive, job->background);
-    saveBigSizeThumnail(*job->archive, renderBigAndMiddleSizeCanvasScene());
-    clearBigSizeCanvasScene();
+    saveBigSizeThumnail(*job->archive, drawPictures(*job->archive, job->background));
 }
 
-void ThumbnailRender::createBigSizeCanvasSceneUsingArchiveData(const Archive& archive,
-                                                               const QImage& background)
+QList<QImage> ThumbnailRender::drawPictures(const Archive& archive)
 {
-    m_bigBackground =
-        new GraphicsPixmap(archive.getFullPathOfBgResourceBig(), QPixmap::fromImage(background));
-    m_bigScene.addItem(m_bigBackground);
-    m_bigBackground->setPos(0, 0);
-    m_bigBackground->setZValue(archive.getBgPointZ());
-    for (TText* record : archive.text()) {
-        auto* text = new GraphicsText(record, record->getTextObjectID());
-        text->setRadio(RASTER_RATIO, true);
-        text->setPos(record->getXValue() * TO_DOUBLE_RASTER * TO_RASTER,
-                     record->getYValue() * TO_DOUBLE_RASTER * TO_RASTER);
-        text->setZValue(record->getZValue());
-        text->initShowText();
-        m_bigScene.addItem(text);
-    }
-    limitTextsToRaster(m_bigScene);
+    const QString background = archive.getFullPathOfBgResourceBig();
+    return drawPictures(archive, background.isEmpty() ? QImage() : BackgroundPicture::read(background));
+}
+
+QList<QImage> ThumbnailRender::drawPictures(const Archive& archive, const QImage& background)
+{
+    m_bigScene.show(archive, background);
+    const QList<QImage> images = renderBigAndMiddleSizeCanvasScene();
+    clearBigSizeCanvasScene();
+    return images;
 }
 
 QList<QImage> ThumbnailRender::renderBigAndMiddleSizeCanvasScene()
 {
-    const QImage big = renderScene(m_bigScene, THUMBNAIL_BIG_SIZE);
+    const QImage big = renderScene(m_bigScene.scene(), THUMBNAIL_BIG_SIZE);
     const QImage middle = big.scaled(THUMBNAIL_MIDDLE_SIZE, Qt::IgnoreAspectRatio, Qt::SmoothTransformation);
     return {big, middle};
 }
@@ -247,7 +233,6 @@ void ThumbnailRender::saveBigSizeThumnail(const Archive& archive, const QList<QI
 void ThumbnailRender::clearBigSizeCanvasScene()
 {
     m_bigScene.clear();
-    m_bigBackground = nullptr;
     clearBigSizeCanvasSceneResource();
 }
 

@@ -2,6 +2,7 @@
 
 #include "canvas/IThumbnailRender.h"
 #include "library/PictureThread.h"
+#include "library/RasterScene.h"
 
 #include <QColor>
 #include <QGraphicsScene>
@@ -51,6 +52,10 @@ public:
     int unfinishedTitles() override;
     void folderRenamed(const QString& before, const QString& after) override;
 
+    // Draws the 1920x1080 and the 960x540 picture of the title at once, as the slow stage does, and returns
+    // them without writing files.
+    QList<QImage> drawPictures(const Archive& archive);
+
     // Called before the scenes are cleared. For subclasses with resources of their own.
     virtual void clearBigSizeCanvasSceneResource();
     virtual void clearMiddleSizeCanvasSceneResource();
@@ -59,7 +64,7 @@ private:
     void makeMiddleAndSmallSizeThumbnail(const Archive& archive);
     void makeBigSizeThumbnail(const Archive& archive);
     void createMiddleSizeCanvasSceneUsingArchiveData(const Archive& archive);
-    void createBigSizeCanvasSceneUsingArchiveData(const Archive& archive, const QImage& background);
+    QList<QImage> drawPictures(const Archive& archive, const QImage& background);
     void drawDecodedBigPictures();
     void drawNextBigPicture();
     QImage renderMiddleSizeCanvasScene();
@@ -80,8 +85,7 @@ private:
 
     std::deque<std::unique_ptr<BigPicture>> m_bigPictures;
     QGraphicsScene m_middleScene;
-    QGraphicsScene m_bigScene;
+    RasterScene m_bigScene;
     GraphicsPixmap* m_middleBackground = nullptr; // owned by m_middleScene
-    GraphicsPixmap* m_bigBackground = nullptr;    // owned by m_bigScene
     PictureThread m_pictureThread;                // last, so that it is destroyed before the scenes
 };

@@ -1,0 +1,152 @@
+#include "titlectl/RenderCommand.h"
+
+#include "titlectl/Arguments.h"
+#include "titlectl/FolderLocks.h"
+#include "titlectl/Output.h"
+#include "titlectl/RenderWorkers.h"
+#include "titlectl/TitleRenderer.h"
+
+#include <QCoreApplication>
+#include <QDir>
+#include <QFileInfo>
+#include <QJsonArray>
+#include <QJsonDocument>
+#include <QJsonObject>
+#include <QThread>
+#include <algorithm>
+
+namespace
+{
+
+const QString OUT = QStringLiteral("out");
+const QString JOBS = QStringLiteral("jobs");
+const QString ONLY = QStringLiteral("only");
+constexpr int MOST_PROCESSES = 64;
+
+// Returns the number of processes; nothing for a text that is not one.
+std::optional<int> processesOf(const QString& jobs)
+{
+    if (jobs.isEmpty())
+        return std::max(QThread::idealThreadCount(), 1);
+    bool isNumber = false;
+    const int number = jobs.toInt(&isNumber);
+    return isNumber && number >= 1 && number <= MOST_PROCESSES ? std::optional<int>(number) : std::nullopt;
+}
+
+// Returns the folders that the jobs write to.
+QStringList targetsOf(const QList<RenderJob>& jobs)
+{
+    QStringList targets;
+    for (const RenderJob& job : jobs)
+        if (!job.folder.isEmpty() && !targets.contains(job.folder))
+            targets.append(job.folder);
+    return targets;
+}
+
+} // namespace
+
+QString RenderCommand::summary() const
+{
+    return QStringLiteral("makes the four pictures of title files, or of all titles of folders");
+}
+
+QList<CommandOption> RenderCommand::options() const
+{
+    return {{OUT, QStringLiteral("DIR"), QStringLiteral("write the pictures there, not beside the titles")},
+            {JOBS, QStringLiteral("N"), QStringLiteral("use N processes; without it one for each processor")},
+            {ONLY, QStringLiteral("WIDTH"), QStringLiteral("make one size only: 1920, 960 or 240")},
+            forceOption()};
+}
+
+std::optional<PictureFiles::Pictures> RenderCommand::picturesOf(const QString& only)
+{
+    if (only.isEmpty())
+        return PictureFiles::Pictures(PictureFiles::ALL);
+    if (only == QLatin1String("1920"))
+        return PictureFiles::Big;
+    if (only == QLatin1String("960"))
+        return PictureFiles::Middle;
+    if (only == QLatin1String("240"))
+        return PictureFiles::Reduced;
+    return std::nullopt;
+}
+
+QList<RenderJob> RenderCommand::jobsFor(const QList<TitlePaths::Folder>& folders, const QString& out,
+                                        PictureFiles::Pictures pictures)
+{
+    QList<RenderJob> jobs;
+    for (const TitlePaths::Folder& folder : folders) {
+        QString target = out;
+        if (!out.isEmpty() && folders.size() > 1)
+            target += QLatin1Char('/') + QFileInfo(folder.path).fileName();
+        for (const QString& title : folder.titles)
+            jobs.append({title, target, pictures});
+    }
+    return jobs;
+}
+
+int RenderCommand::run(const Arguments& arguments, Output& output)
+{
+    const auto refuse = [&output](const QString& reason) {
+        output.message(reason);
+        return WrongUse;
+    };
+    const std::optional<PictureFiles::Pictures> pictures = picturesOf(arguments.value(ONLY));
+    if (!pictures)
+        return refuse(QStringLiteral("--only expects 1920, 960 or 240"));
+    const std::optional<int> processes = processesOf(arguments.value(JOBS));
+    if (!processes)
+        return refuse(QStringLiteral("--jobs expects a number from 1 to %1").arg(MOST_PROCESSES));
+    const TitlePaths paths(arguments.operands());
+    if (!paths.isValid())
+        return refuse(paths.error());
+    const QString out = arguments.has(OUT) ? QDir::cleanPath(QFileInfo(arguments.value(OUT)).absoluteFilePath())
+                                           : QString();
+    const QList<RenderJob> jobs = jobsFor(paths.folders(), out, *pictures);
+    FolderLocks locks;
+    const auto kind = out.isEmpty() ? FolderLock::Kind::Exclusive : FolderLock::Kind::Shared;
+    const auto inUse = arguments.has(FORCE) ? FolderLocks::InUse::GoOn : FolderLocks::InUse::Refuse;
+    if (!locks.take(paths.folderPaths(), kind, inUse, output))
+        return WrongUse;
+    for (const QString& target : targetsOf(jobs))
+        if (!QDir().mkpath(target))
+            return refuse(QStringLiteral("cannot make the folder %1").arg(target));
+    return report(jobs, render(jobs, *processes, output), output);
+}
+
+// Renders the titles and returns what went wrong with each.
+QStringList RenderCommand::render(const QList<RenderJob>& jobs, int processes, Output& output)
+{
+    QStringList errors(jobs.size());
+    int done = 0;
+    const int total = static_cast<int>(jobs.size());
+    const auto isDone = [&](qsizetype job, const QString& error) {
+        errors[job] = error;
+        output.progress(++done, total);
+    };
+    if (processes > 1 && jobs.size() > 1) {
+        RenderWorkers(QCoreApplication::applicationFilePath(), processes).run(jobs, isDone);
+    } else {
+        TitleRenderer renderer;
+        for (qsizetype i = 0; i < jobs.size(); ++i)
+            isDone(i, renderer.render(jobs.at(i)));
+    }
+    return errors;
+}
+
+int RenderCommand::report(const QList<RenderJob>& jobs, const QStringList& errors, Output& output)
+{
+    QJsonArray titles;
+    int failed = 0;
+    for (qsizetype i = 0; i < jobs.size(); ++i) {
+        const QString& title = jobs.at(i).title;
+        titles.append(QJsonObject{{QStringLiteral("file"), title}, {QStringLiteral("error"), errors.at(i)}});
+        if (errors.at(i).isEmpty())
+            continue;
+        ++failed;
+        output.message(QStringLiteral("%1: %2").arg(title, errors.at(i)));
+    }
+    output.line(QStringLiteral("%1 of %2 titles rendered").arg(jobs.size() - failed).arg(jobs.size()));
+    output.json(QJsonDocument(QJsonObject{{QStringLiteral("titles"), titles}, {QStringLiteral("failed"), failed}}));
+    return failed > 0 ? Findings : Success;
+}
