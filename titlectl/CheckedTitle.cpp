@@ -2,7 +2,7 @@
 
 #include "document/TitleParser.h"
 #include "titlectl/TitleInk.h"
-#include "titlectl/TitlePictures.h"
+#include "titlectl/PictureStates.h"
 
 #include <QFileInfo>
 #include <utility>
@@ -23,9 +23,9 @@ const TitleInk& CheckedTitle::ink() const
     return *m_ink;
 }
 
-const TitlePictures& CheckedTitle::pictures() const
+const PictureStates& CheckedTitle::pictures() const
 {
     if (!m_pictures)
-        m_pictures = std::make_unique<TitlePictures>(m_archive, m_changed);
+        m_pictures = std::make_unique<PictureStates>(m_archive, m_changed);
     return *m_pictures;
 }

@@ -7,7 +7,7 @@
 #include <memory>
 
 class TitleInk;
-class TitlePictures;
+class PictureStates;
 
 // A title as it is on the disk, for the rules of the check. GUI thread only.
 class CheckedTitle
@@ -24,7 +24,7 @@ public:
     const Archive& archive() const { return m_archive; }
     // Return what the texts draw and what is wrong with the picture files; found out when it is first asked for.
     const TitleInk& ink() const;
-    const TitlePictures& pictures() const;
+    const PictureStates& pictures() const;
 
 private:
     QString m_path;
@@ -32,5 +32,5 @@ private:
     QDateTime m_changed;
     bool m_isReadable = false;
     mutable std::unique_ptr<TitleInk> m_ink;
-    mutable std::unique_ptr<TitlePictures> m_pictures;
+    mutable std::unique_ptr<PictureStates> m_pictures;
 };

@@ -3,6 +3,7 @@
 #include "titlectl/Arguments.h"
 #include "titlectl/CheckCommand.h"
 #include "titlectl/Command.h"
+#include "titlectl/MakeCommand.h"
 #include "titlectl/Output.h"
 #include "titlectl/ProgramTexts.h"
 #include "titlectl/RenderCommand.h"
@@ -19,6 +20,7 @@ CommandTable::CommandTable()
 {
     // In the order of the help.
     m_commands.push_back(std::make_unique<RenderCommand>());
+    m_commands.push_back(std::make_unique<MakeCommand>());
     m_commands.push_back(std::make_unique<CheckCommand>());
     m_commands.push_back(std::make_unique<ShowCommand>());
     m_commands.push_back(std::make_unique<SetCommand>());

@@ -1,18 +1,18 @@
 #include "titlectl/PictureRules.h"
 
 #include "titlectl/CheckedTitle.h"
-#include "titlectl/TitlePictures.h"
+#include "titlectl/PictureStates.h"
 
 namespace
 {
 
-using State = TitlePictures::State;
+using State = PictureStates::State;
 
 template <State wanted> void check(const CheckedTitle& title, FindingList& findings)
 {
     if (!title.isReadable())
         return;
-    for (const TitlePictures::Fault& fault : title.pictures().faults())
+    for (const PictureStates::Fault& fault : title.pictures().faults())
         if (fault.state == wanted)
             findings.append({title.path(), fault.picture, {}, fault.reason});
 }

@@ -3,35 +3,19 @@
 #include "titlectl/Arguments.h"
 #include "titlectl/FolderLocks.h"
 #include "titlectl/Output.h"
-#include "titlectl/RenderWorkers.h"
-#include "titlectl/TitleRenderer.h"
+#include "titlectl/RenderBatch.h"
 
-#include <QCoreApplication>
 #include <QDir>
 #include <QFileInfo>
 #include <QJsonArray>
 #include <QJsonDocument>
 #include <QJsonObject>
-#include <QThread>
-#include <algorithm>
 
 namespace
 {
 
 const QString OUT = QStringLiteral("out");
-const QString JOBS = QStringLiteral("jobs");
 const QString ONLY = QStringLiteral("only");
-constexpr int MOST_PROCESSES = 64;
-
-// Returns the number of processes; nothing for a text that is not one.
-std::optional<int> processesOf(const QString& jobs)
-{
-    if (jobs.isEmpty())
-        return std::max(QThread::idealThreadCount(), 1);
-    bool isNumber = false;
-    const int number = jobs.toInt(&isNumber);
-    return isNumber && number >= 1 && number <= MOST_PROCESSES ? std::optional<int>(number) : std::nullopt;
-}
 
 // Returns the folders that the jobs write to.
 QStringList targetsOf(const QList<RenderJob>& jobs)
@@ -53,7 +37,7 @@ QString RenderCommand::summary() const
 QList<CommandOption> RenderCommand::options() const
 {
     return {{OUT, QStringLiteral("DIR"), QStringLiteral("write the pictures there, not beside the titles")},
-            {JOBS, QStringLiteral("N"), QStringLiteral("use N processes; without it one for each processor")},
+            RenderBatch::jobsOption(),
             {ONLY, QStringLiteral("WIDTH"), QStringLiteral("make one size only: 1920, 960 or 240")},
             forceOption()};
 }
@@ -94,9 +78,9 @@ int RenderCommand::run(const Arguments& arguments, Output& output)
     const std::optional<PictureFiles::Pictures> pictures = picturesOf(arguments.value(ONLY));
     if (!pictures)
         return refuse(QStringLiteral("--only expects 1920, 960 or 240"));
-    const std::optional<int> processes = processesOf(arguments.value(JOBS));
+    const std::optional<int> processes = RenderBatch::processesOf(arguments.value(RenderBatch::JOBS));
     if (!processes)
-        return refuse(QStringLiteral("--jobs expects a number from 1 to %1").arg(MOST_PROCESSES));
+        return refuse(QStringLiteral("--jobs expects a number from 1 to %1").arg(RenderBatch::MOST_PROCESSES));
     const TitlePaths paths(arguments.operands());
     if (!paths.isValid())
         return refuse(paths.error());
@@ -111,27 +95,10 @@ int RenderCommand::run(const Arguments& arguments, Output& output)
     for (const QString& target : targetsOf(jobs))
         if (!QDir().mkpath(target))
             return refuse(QStringLiteral("cannot make the folder %1").arg(target));
-    return report(jobs, render(jobs, *processes, output), output);
-}
-
-// Renders the titles and returns what went wrong with each.
-QStringList RenderCommand::render(const QList<RenderJob>& jobs, int processes, Output& output)
-{
-    QStringList errors(jobs.size());
     int done = 0;
-    const int total = static_cast<int>(jobs.size());
-    const auto isDone = [&](qsizetype job, const QString& error) {
-        errors[job] = error;
-        output.progress(++done, total);
-    };
-    if (processes > 1 && jobs.size() > 1) {
-        RenderWorkers(QCoreApplication::applicationFilePath(), processes).run(jobs, isDone);
-    } else {
-        TitleRenderer renderer;
-        for (qsizetype i = 0; i < jobs.size(); ++i)
-            isDone(i, renderer.render(jobs.at(i)));
-    }
-    return errors;
+    const QStringList errors = RenderBatch::run(
+        jobs, *processes, [&] { output.progress(++done, static_cast<int>(jobs.size())); });
+    return report(jobs, errors, output);
 }
 
 int RenderCommand::report(const QList<RenderJob>& jobs, const QStringList& errors, Output& output)

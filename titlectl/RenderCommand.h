@@ -26,6 +26,5 @@ public:
                                     PictureFiles::Pictures pictures);
 
 private:
-    static QStringList render(const QList<RenderJob>& jobs, int processes, Output& output);
     static int report(const QList<RenderJob>& jobs, const QStringList& errors, Output& output);
 };

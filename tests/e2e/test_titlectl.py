@@ -2,6 +2,7 @@
 import fcntl
 import json
 import os
+import re
 import shutil
 import signal
 import subprocess
@@ -105,6 +106,56 @@ class Titlectl(unittest.TestCase):
         changed = sorted(name for name, data in self.pictures(self.folder).items() if data != before[name])
         stem = os.path.basename(title)[:-len(".xml")]
         self.assertEqual(changed, sorted(stem + suffix for suffix in harness.PICTURES))
+
+    def order(self, folder):
+        with open(os.path.join(folder, ".order.xml"), encoding="utf-8") as stream:
+            return re.findall(r'file-path="([^"]*)"', stream.read())
+
+    def write_list(self, text, name="list.csv"):
+        path = os.path.join(self.work, name)
+        with open(path, "w", encoding="utf-8", newline="") as stream:
+            stream.write(text)
+        return path
+
+    def test_a_list_makes_titles_and_updates_them(self):
+        template = self.first_title()
+        text = str(self.json("show", template)["texts"][0]["id"])
+        names = self.write_list(f"No,{text}\r\n1,Anna Berg\r\n2,Bo Lind\r\n3,\"Cem, Ay\"\r\n")
+        folder = os.path.join(self.titles, "Made")
+        dry = self.json("make", "--dry-run", template, names, folder)
+        self.assertEqual([row["outcome"] for row in dry["rows"]], ["would be made"] * 3)
+        self.assertFalse(os.path.exists(folder))
+        self.run_titlectl("make", "--key", "No", template, names, folder)
+        first = self.order(folder)
+        self.assertEqual(len(first), 3)
+        shown = [self.json("show", os.path.join(folder, name))["texts"] for name in first]
+        wanted = ["Anna Berg", "Bo Lind", "Cem, Ay"]
+        self.assertEqual([next(one["text"] for one in texts if str(one["id"]) == text) for texts in shown], wanted)
+        self.assertEqual(self.json("check", "--without", "text-unsafe", folder)["findings"], [])
+        before = self.pictures(folder)
+        self.run_titlectl("render", folder)
+        self.assertEqual(self.pictures(folder), before)
+
+        # The same list again, with one row changed and one more.
+        names = self.write_list(f"No,{text}\n3,Cem Ay\n1,Anna Berg\n4,Dora\n")
+        again = self.json("make", "--key", "No", template, names, folder)
+        self.assertEqual([row["outcome"] for row in again["rows"]], ["updated", "updated", "made"])
+        self.assertEqual(self.order(folder)[:3], first)
+        self.assertEqual(len(self.order(folder)), 4)
+        self.assertEqual([name for name in os.listdir(folder) if name.startswith(".") and name != ".order.xml"], [])
+
+    def test_a_wrong_row_stops_no_other_but_with_strict(self):
+        template = self.first_title()
+        text = str(self.json("show", template)["texts"][0]["id"])
+        names = self.write_list(f"{text}\nAnna\n{'x' * 301}\nBo\n")
+        folder = os.path.join(self.work, "made")
+        done = self.run_titlectl("make", "--strict", template, names, folder, code=FINDINGS)
+        self.assertIn("line 3:", done.stderr)
+        self.assertFalse(os.path.exists(folder))
+        done = self.run_titlectl("make", template, names, folder, code=FINDINGS)
+        self.assertIn("line 3:", done.stderr)
+        self.assertEqual(len(self.order(folder)), 2)
+        self.run_titlectl("make", template, os.path.join(self.work, "none.csv"), folder, code=WRONG_USE)
 
     def test_sheet(self):
         for name, begin in (("sheet.pdf", b"%PDF-"), ("sheet.png", b"\x89PNG")):

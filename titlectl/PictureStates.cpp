@@ -1,4 +1,4 @@
-#include "titlectl/TitlePictures.h"
+#include "titlectl/PictureStates.h"
 
 #include "document/Archive.h"
 #include "document/PictureReader.h"
@@ -13,9 +13,9 @@
 namespace
 {
 
-QString reasonOf(TitlePictures::State state, const QString& path, QSize size)
+QString reasonOf(PictureStates::State state, const QString& path, QSize size)
 {
-    using State = TitlePictures::State;
+    using State = PictureStates::State;
     const QString name = QFileInfo(path).fileName();
     switch (state) {
     case State::Missing:
@@ -35,7 +35,7 @@ QString reasonOf(TitlePictures::State state, const QString& path, QSize size)
 
 } // namespace
 
-TitlePictures::TitlePictures(const Archive& archive, const QDateTime& titleChanged)
+PictureStates::PictureStates(const Archive& archive, const QDateTime& titleChanged)
 {
     const auto beside = [&archive](const std::string& name) { return PictureFiles::path(archive, name); };
     const QString small = archive.getThumbnailSmall().starts_with('/') ? archive.getFullPathOfThumbnailSmall()
@@ -53,13 +53,13 @@ TitlePictures::TitlePictures(const Archive& archive, const QDateTime& titleChang
         judge(QStringLiteral("background 1920"), archive.getFullPathOfBgResourceBig(), QSize(), QDateTime());
 }
 
-void TitlePictures::judge(const QString& picture, const QString& path, QSize size, const QDateTime& notBefore)
+void PictureStates::judge(const QString& picture, const QString& path, QSize size, const QDateTime& notBefore)
 {
     if (const State state = stateOf(path, size, notBefore); state != State::Good)
         m_faults.append({picture, state, reasonOf(state, path, size)});
 }
 
-TitlePictures::State TitlePictures::stateOf(const QString& path, QSize size, const QDateTime& notBefore)
+PictureStates::State PictureStates::stateOf(const QString& path, QSize size, const QDateTime& notBefore)
 {
     const QFileInfo file(path);
     if (path.isEmpty() || !file.exists())

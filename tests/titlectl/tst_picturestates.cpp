@@ -1,13 +1,13 @@
 // What is wrong with the pictures of a title.
 #include "RenderedFolder.h"
-#include "titlectl/TitlePictures.h"
+#include "titlectl/PictureStates.h"
 
 #include <QDateTime>
 #include <QTest>
 
-using State = TitlePictures::State;
+using State = PictureStates::State;
 
-class tst_titlepictures : public QObject
+class tst_picturestates : public QObject
 {
     Q_OBJECT
 
@@ -21,7 +21,7 @@ private:
     LibraryFixture m_fixture;
 };
 
-void tst_titlepictures::states_data()
+void tst_picturestates::states_data()
 {
     QTest::addColumn<QByteArray>("damage");
     QTest::addColumn<State>("state");
@@ -33,7 +33,7 @@ void tst_titlepictures::states_data()
     QTest::newRow("old") << QByteArray("age") << State::Old;
 }
 
-void tst_titlepictures::states()
+void tst_picturestates::states()
 {
     QFETCH(QByteArray, damage);
     QFETCH(State, state);
@@ -49,18 +49,18 @@ void tst_titlepictures::states()
     if (damage == "empty")
         QVERIFY(QFile::resize(path, 0));
     const QSize size = damage == "resize" ? QSize(32, 18) : QSize(64, 36);
-    QCOMPARE(TitlePictures::stateOf(path, size, written.addSecs(damage == "age" ? 1 : 0)), state);
+    QCOMPARE(PictureStates::stateOf(path, size, written.addSecs(damage == "age" ? 1 : 0)), state);
 }
 
-void tst_titlepictures::goodTitleHasNoFault()
+void tst_picturestates::goodTitleHasNoFault()
 {
     const QString folder = renderedFolder(m_fixture, "good", {"a"});
     Archive archive;
     QVERIFY(ArchiveController().getOneArchive(folder + "/a.xml", &archive));
-    QVERIFY(TitlePictures(archive, QFileInfo(folder + "/a.xml").lastModified()).faults().isEmpty());
+    QVERIFY(PictureStates(archive, QFileInfo(folder + "/a.xml").lastModified()).faults().isEmpty());
 }
 
-void tst_titlepictures::everyPictureIsLookedAt()
+void tst_picturestates::everyPictureIsLookedAt()
 {
     const QString folder = renderedFolder(m_fixture, "all", {"a"});
     Archive archive;
@@ -70,8 +70,8 @@ void tst_titlepictures::everyPictureIsLookedAt()
     for (const char* name : {"a_1920.png", "a_960.png", "a_240.png", "a_240S.png"})
         QVERIFY(QFile::remove(folder + '/' + name));
     QStringList pictures;
-    const TitlePictures found(archive, QDateTime());
-    for (const TitlePictures::Fault& fault : found.faults()) {
+    const PictureStates found(archive, QDateTime());
+    for (const PictureStates::Fault& fault : found.faults()) {
         QCOMPARE(fault.state, State::Missing);
         pictures.append(fault.picture);
     }
@@ -79,5 +79,5 @@ void tst_titlepictures::everyPictureIsLookedAt()
                                     "background 1280", "background 1920"}));
 }
 
-QTEST_MAIN(tst_titlepictures)
-#include "tst_titlepictures.moc"
+QTEST_MAIN(tst_picturestates)
+#include "tst_picturestates.moc"

@@ -8,7 +8,7 @@
 class Archive;
 
 // What is wrong with the picture files of a title and its background: one fault for each at most. Any thread.
-class TitlePictures
+class PictureStates
 {
 public:
     enum class State { Good, Missing, Torn, WrongSize, Old };
@@ -19,7 +19,7 @@ public:
     };
 
     // titleChanged is when the title file was written; older pictures do not show the title as it is.
-    TitlePictures(const Archive& archive, const QDateTime& titleChanged);
+    PictureStates(const Archive& archive, const QDateTime& titleChanged);
 
     const QList<Fault>& faults() const { return m_faults; }
 
