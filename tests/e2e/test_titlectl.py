@@ -131,7 +131,7 @@ class Titlectl(unittest.TestCase):
         shown = [self.json("show", os.path.join(folder, name))["texts"] for name in first]
         wanted = ["Anna Berg", "Bo Lind", "Cem, Ay"]
         self.assertEqual([next(one["text"] for one in texts if str(one["id"]) == text) for texts in shown], wanted)
-        self.assertEqual(self.json("check", "--without", "text-unsafe", folder)["findings"], [])
+        self.assertEqual(self.json("check", "--without", "text-outside-safe-area", folder)["findings"], [])
         before = self.pictures(folder)
         self.run_titlectl("render", folder)
         self.assertEqual(self.pictures(folder), before)
