@@ -14,6 +14,7 @@
 #include <QMenu>
 #include <QMouseEvent>
 #include <QPainter>
+#include <QPixmap>
 #include <QVBoxLayout>
 
 const QSize ToolsBar::BAR_ICON_SIZE(120, 67);
@@ -68,8 +69,9 @@ ToolsBar::~ToolsBar() = default;
 ToolsBar::ToolButton ToolsBar::createButton(const QString& iconName, const QPoint& textPoint)
 {
     ToolButton tool;
-    tool.icon = QIcon(QStringLiteral(":/Icon_") + iconName);
-    tool.disabledIcon = QIcon(QStringLiteral(":/Icon_Disabled_") + iconName);
+    // From a name without suffix, an icon reads the database of MIME types.
+    tool.icon = QIcon(QPixmap(QStringLiteral(":/Icon_") + iconName));
+    tool.disabledIcon = QIcon(QPixmap(QStringLiteral(":/Icon_Disabled_") + iconName));
     tool.button = new KSPushbutton(QString::fromLatin1(TOOL_IMAGES), this);
     tool.button->setObjectName(iconName);
     tool.button->setFixedSize(TOOLBARBTN_SIZE);

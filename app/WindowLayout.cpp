@@ -5,6 +5,7 @@
 #include <QHBoxLayout>
 #include <QLabel>
 #include <QMainWindow>
+#include <QPixmap>
 #include <QPushButton>
 #include <QVBoxLayout>
 
@@ -14,7 +15,7 @@ namespace
 QPushButton* folderIcon(QWidget* parent)
 {
     auto* icon = new QPushButton(parent);
-    icon->setIcon(QIcon(QStringLiteral(":/FolderPicker/Titler_folder_icon")));
+    icon->setIcon(QIcon(QPixmap(QStringLiteral(":/FolderPicker/Titler_folder_icon"))));
     icon->setFixedSize(28, 30);
     icon->setIconSize(QSize(28, 28));
     icon->setEnabled(false);

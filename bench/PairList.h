@@ -12,9 +12,9 @@ class PairList
 {
 public:
     // The clock from which the ratio is computed. Cpu: of the measured thread, for work that does not wait.
-    // Wall: for work with files, threads or other processes. Step: wall clock for the part of an iteration
-    // that the body measures itself.
-    enum class Clock { Cpu, Wall, Step };
+    // Process: of all threads of this process. Wall: for work with files, threads or other processes. Step:
+    // wall clock for the part of an iteration that the body measures itself.
+    enum class Clock { Cpu, Process, Wall, Step };
 
     struct Pair {
         std::string name;

@@ -51,7 +51,8 @@ double PairReporter::timeOf(const std::string& name, PairList::Clock clock) cons
     const auto found = m_times.find(name);
     if (found == m_times.end())
         return 0;
-    return median(clock == PairList::Clock::Cpu ? found->second.cpu : found->second.wall);
+    const bool isProcessorTime = clock == PairList::Clock::Cpu || clock == PairList::Clock::Process;
+    return median(isProcessorTime ? found->second.cpu : found->second.wall);
 }
 
 void PairReporter::Finalize()

@@ -32,6 +32,12 @@ size_t qHash(const GlyphKey& key, size_t seed)
     return qHashMulti(seed, key.family, key.text, key.pixelSize, key.weight, key.italic, key.spacing);
 }
 
+quint64 nextId()
+{
+    static quint64 last = 0;
+    return ++last;
+}
+
 bool mayBePicture(const QString& text)
 {
     return std::any_of(text.begin(), text.end(), [](QChar c) {
@@ -109,7 +115,7 @@ bool drawnAsPicture(const QList<QGlyphRun>& runs)
 } // namespace
 
 GlyphPath::GlyphPath(const QFont& font, const QString& text)
-    : m_font(font), m_text(text), m_hasPath(!mayBePicture(text) || !drawnAsPicture(runs()))
+    : m_id(nextId()), m_font(font), m_text(text), m_hasPath(!mayBePicture(text) || !drawnAsPicture(runs()))
 {
 }
 

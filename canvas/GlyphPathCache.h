@@ -14,6 +14,7 @@ class GlyphPath
 {
 public:
     GlyphPath(const QFont& font, const QString& text);
+    Q_DISABLE_COPY(GlyphPath)
 
     // Returns false for characters without an outline, such as colour emoji, which only the font system can
     // draw.
@@ -29,6 +30,8 @@ public:
 
     // Returns an estimate of the bytes that all forms take.
     int cost() const;
+    // Returns a number that no other object of this process has or had.
+    quint64 id() const { return m_id; }
 
 private:
     struct Outline {
@@ -36,6 +39,7 @@ private:
         QPainterPath area;
     };
 
+    quint64 m_id;
     QFont m_font;
     QString m_text;
     mutable QPainterPath m_fill;

@@ -13,6 +13,7 @@
 #include "touchui/KSSoftKeyboardCursorSettingEvent.h"
 
 #include <QAbstractEventDispatcher>
+#include <QAbstractTextDocumentLayout>
 #include <QClipboard>
 #include <QGraphicsScene>
 #include <QGraphicsSceneContextMenuEvent>
@@ -22,10 +23,13 @@
 #include <QMimeData>
 #include <QPainter>
 #include <QStyleHints>
+#include <QStyleOptionGraphicsItem>
+#include <QTextBlock>
 #include <QTextCursor>
 #include <QTextDocument>
 #include <QTextOption>
 #include <algorithm>
+#include <utility>
 
 using namespace TextObjectConstants;
 
@@ -80,6 +84,7 @@ void GraphicsText::initDataForGraphicsText()
 
     setFlag(ItemIsMovable);
     setFlag(ItemIsSelectable);
+    setFlag(ItemUsesExtendedStyleOption); // so that only what is exposed is painted
     setAcceptTouchEvents(true);
     // The frame is larger than the child. A finger on it must not drag the parent without the child.
     if (m_parentObject)
@@ -100,9 +105,13 @@ void GraphicsText::initDataForGraphicsText()
     setGraphicsEffect(m_shadowEffect);
 
     installEventFilter(this);
+    QAbstractTextDocumentLayout* layout = document()->documentLayout();
     const QObjectList parts = children();
-    for (QObject* part : parts)
+    for (QObject* part : parts) {
         part->installEventFilter(this);
+        disconnect(layout, &QAbstractTextDocumentLayout::update, part, nullptr);
+    }
+    connect(layout, &QAbstractTextDocumentLayout::update, this, &GraphicsText::repaintLayout);
     if (IInputLanguageSource* source = IInputLanguageSource::instance()) {
         connect(source, &IInputLanguageSource::signalsInputLanguageInfo, this,
                 &GraphicsText::slotObjectDisplayInputLanguage);
@@ -396,6 +405,36 @@ void GraphicsText::layoutChanged()
     update();
 }
 
+void GraphicsText::repaintBlock(int position)
+{
+    const QTextBlock block = document()->findBlock(position);
+    if (!block.isValid()) {
+        update();
+        return;
+    }
+    const QRectF lines = document()->documentLayout()->blockBoundingRect(block);
+    const double reach = lines.height() / 2.0 + HANDLEPIXMAPHEIGHT;
+    // The frame behind it is painted again with the scene.
+    QGraphicsTextItem::update(QRectF(layoutRect().left(), lines.top(), layoutRect().width(), lines.height())
+                                  .adjusted(-reach, -reach, reach, reach));
+}
+
+void GraphicsText::blockChanged(int position)
+{
+    m_painter->invalidate();
+    repaintBlock(position);
+    m_isBlockRepainted = true;
+}
+
+// At the end of an edit the layout requests a repaint of everything, because it finds nothing left to do: the
+// block was laid out when its formats were applied. That is the request after blockChanged().
+void GraphicsText::repaintLayout(const QRectF& area)
+{
+    const bool isEverything = area.topLeft().isNull() && area.height() > layoutRect().height();
+    if (!std::exchange(m_isBlockRepainted, false) || !isEverything)
+        QGraphicsTextItem::update(area);
+}
+
 void GraphicsText::showShadow(const TShadow& shadow)
 {
     m_shadowEffect->setOffset(shadow.getShadowDirectionX() * canvasRatio(),
@@ -536,7 +575,7 @@ QRectF GraphicsText::boundingRect() const
     return layoutRect().united(child->layoutRect()).adjusted(-pen, -pen, pen, pen);
 }
 
-void GraphicsText::paint(QPainter* painter, const QStyleOptionGraphicsItem*, QWidget*)
+void GraphicsText::paint(QPainter* painter, const QStyleOptionGraphicsItem* option, QWidget*)
 {
     // The base class has nothing to paint: Qt's selection frame and the document's own caret are not wanted,
     // and its glyphs are transparent.
@@ -546,7 +585,7 @@ void GraphicsText::paint(QPainter* painter, const QStyleOptionGraphicsItem*, QWi
     } else {
         m_touchEditor->paintBelowGlyphs(painter);
         m_painter->drawSelection(painter, textCursor(), hasFocus());
-        m_painter->drawItemText(painter);
+        m_painter->drawItemText(painter, option ? option->exposedRect : boundingRect());
         if (getBoundingLineStatus() == FocusEdit)
             m_touchEditor->paintAboveGlyphs(painter);
     }

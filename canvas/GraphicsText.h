@@ -128,8 +128,8 @@ public:
     QGraphicsDropShadowEffect* shadowEffect() const { return m_shadowEffect; }
     // Returns the rectangle of the layout, which does not depend on the bounding rect flag.
     QRectF layoutRect() const { return QGraphicsTextItem::boundingRect(); }
-    // Returns the area that the glyphs and their outlines cover, in item coordinates; empty without ink. Shadows
-    // are not counted.
+    // Returns the area that the glyphs and their outlines cover, in item coordinates; empty without ink.
+    // Shadows are not counted.
     QRectF inkRect() const;
     void parentFollows() override;
 
@@ -191,6 +191,9 @@ private:
     void announceGeometryChange() override;
     void layoutChanged() override;
     void repaint() override { update(); }
+    void repaintBlock(int position) override;
+    void blockChanged(int position) override;
+    void repaintLayout(const QRectF& area);
     void showShadow(const TShadow& shadow) override;
 
     // ITextObjectListener
@@ -220,6 +223,7 @@ private:
     // Owned by the item, see setGraphicsEffect().
     QGraphicsDropShadowEffect* m_shadowEffect = nullptr;
     int m_focusFlag = TextObjectConstants::FocusNone;
+    bool m_isBlockRepainted = false; // until the layout requests to repaint everything
     bool m_parentObject = false;
     bool m_bigScene = false;
     bool m_boundingRectFlag = false;

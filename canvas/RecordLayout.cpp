@@ -122,7 +122,33 @@ void RecordLayout::updateWidthAndAlign()
         m_parts.document.setTextWidth(width);
     setDocumentAlign(width);
     m_lastWidth = width;
+    m_lastHeight = m_parts.document.size().height();
+    m_lastBlocks = m_parts.document.blockCount();
     m_parts.surface.layoutChanged();
+}
+
+void RecordLayout::updateAfterTyping(int position)
+{
+    if (isFitted())
+        m_parts.surface.blockChanged(position);
+    else
+        updateWidthAndAlign();
+}
+
+// Returns whether updateWidthAndAlign() would leave everything as it is.
+bool RecordLayout::isFitted() const
+{
+    const QTextDocument& document = m_parts.document;
+    if (document.blockCount() != m_lastBlocks || document.size().height() != m_lastHeight)
+        return false;
+    const double margin = lineMargin();
+    for (QTextBlock block = document.begin(); block.isValid(); block = block.next()) {
+        const QTextBlockFormat format = block.blockFormat();
+        if (!qFuzzyCompare(format.leftMargin(), margin) || !qFuzzyCompare(format.rightMargin(), margin))
+            return false;
+    }
+    const double width = naturalWidth();
+    return width == m_lastWidth && width == document.textWidth();
 }
 
 // Returns the width of the document without a text width. Lines never wrap, so the text width does not change
@@ -146,15 +172,20 @@ void RecordLayout::finishLayout()
     m_parts.document.setTextWidth(-1.0);
 }
 
+// Returns the margin that fits the tallest line.
+double RecordLayout::lineMargin() const
+{
+    double tallest = 0.0;
+    for (QTextBlock block = m_parts.document.begin(); block.isValid(); block = block.next())
+        if (block.layout()->lineCount() > 0)
+            tallest = std::max(tallest, block.layout()->lineAt(0).height());
+    return marginOf(tallest);
+}
+
 void RecordLayout::adjustLeftAndRightMargin()
 {
     QTextDocument& document = m_parts.document;
-    double tallest = 0.0;
-    for (QTextBlock block = document.begin(); block.isValid(); block = block.next())
-        if (block.layout()->lineCount() > 0)
-            tallest = std::max(tallest, block.layout()->lineAt(0).height());
-    const double margin = marginOf(tallest);
-
+    const double margin = lineMargin();
     QTextCursor cursor(&document);
     cursor.beginEditBlock();
     for (QTextBlock block = document.begin(); block.isValid(); block = block.next()) {

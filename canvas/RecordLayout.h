@@ -22,6 +22,9 @@ public:
     // Fits margins, width and alignment to the text. An object that is centred or aligned right keeps its
     // centre or its right edge where it was at the last call.
     void updateWidthAndAlign();
+    // As above, after characters were added at the position: repaints their paragraph only, if the object
+    // keeps its size and its paragraphs.
+    void updateAfterTyping(int position);
     // Makes the next call of updateWidthAndAlign() leave the object where it is.
     void forgetWidth() { m_lastWidth = 0.0; }
     // Call after characters were removed: the document reports the removal before it has laid itself out.
@@ -30,9 +33,13 @@ public:
 private:
     double expectedMargin() const;
     double naturalWidth() const;
+    double lineMargin() const;
+    bool isFitted() const;
     void adjustLeftAndRightMargin();
     void setDocumentAlign(double width);
 
     TextObjectParts m_parts;
     double m_lastWidth = 0.0;
+    double m_lastHeight = 0.0;
+    int m_lastBlocks = 0;
 };

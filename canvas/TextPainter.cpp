@@ -1,6 +1,7 @@
 #include "canvas/TextPainter.h"
 
 #include "canvas/CharacterFormat.h"
+#include "canvas/GlyphMasks.h"
 #include "canvas/StyleDocument.h"
 
 #include <QAbstractTextDocumentLayout>
@@ -160,7 +161,7 @@ void TextPainter::drawItemTextOutLine(QPainter* painter, const QTransform& origi
         const Glyph& glyph = m_glyphs[step.index];
         painter->setWorldTransform(QTransform(origin).translate(glyph.baseline.x(), glyph.baseline.y()));
         if (glyph.edgeWidth > 0) {
-            painter->fillPath(glyph.path->outline(glyph.edgeWidth), glyph.edgeColor);
+            GlyphMasks::fillOutline(*painter, *glyph.path, glyph.edgeWidth, glyph.edgeColor);
         } else {
             const QPen hairline(glyph.edgeColor, 0, Qt::SolidLine, Qt::SquareCap, Qt::SvgMiterJoin);
             painter->strokePath(glyph.path->contour(), hairline);
@@ -168,13 +169,13 @@ void TextPainter::drawItemTextOutLine(QPainter* painter, const QTransform& origi
     }
 }
 
-void TextPainter::drawItemText(QPainter* painter)
+void TextPainter::drawItemText(QPainter* painter, const QRectF& exposed)
 {
     collectGlyphs();
     const bool antialiasing = painter->testRenderHint(QPainter::Antialiasing);
     const QTransform origin = painter->worldTransform();
     painter->setRenderHint(QPainter::Antialiasing);
-    const QRectF visible = visibleArea(*painter);
+    const QRectF visible = visibleArea(*painter) & exposed.adjusted(-1.0, -1.0, 1.0, 1.0);
     drawItemTextOutLine(painter, origin, visible);
     for (const Step& step : m_steps) {
         if (!visible.intersects(step.reach))
@@ -187,7 +188,7 @@ void TextPainter::drawItemText(QPainter* painter)
         } else {
             const Glyph& glyph = m_glyphs[step.index];
             painter->setWorldTransform(QTransform(origin).translate(glyph.baseline.x(), glyph.baseline.y()));
-            painter->fillPath(glyph.path->fill(), glyph.color);
+            GlyphMasks::fill(*painter, *glyph.path, glyph.color);
         }
     }
     painter->setWorldTransform(origin);

@@ -40,9 +40,10 @@ public:
     quint64 contentVersion() const { return m_version; }
     CaretGeometry& carets() { return m_carets; }
 
-    void drawItemText(QPainter* painter);
-    // Returns the area that drawItemText() covers with glyphs and outlines, in item coordinates; empty if it draws
-    // nothing.
+    // Draws at least what is in the exposed rectangle, in item coordinates.
+    void drawItemText(QPainter* painter, const QRectF& exposed);
+    // Returns the area that drawItemText() covers with glyphs and outlines, in item coordinates; empty if it
+    // draws nothing.
     QRectF inkRect();
     // Draws the frame of a pair: status is that of the child, FocusEdit or FocusObject.
     void drawItemBoundingRect(QPainter* painter, const QRectF& rect, int status);

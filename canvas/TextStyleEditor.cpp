@@ -118,6 +118,7 @@ void TextStyleEditor::documentChanged(int position, int removed, int added)
     if (previewTakenBack) {
         const Guard guard(*this);
         m_layout.applyFormats(0, m_styles.count());
+        m_layout.updateWidthAndAlign();
     }
     showCurrentTextStyle();
     m_listener.textTyped();
@@ -244,7 +245,7 @@ void TextStyleEditor::charsAddedChange(int position, int added)
     m_layout.applyFormats(position, position + int(text.size()));
     if (!m_styles.isEmpty())
         m_layout.setCaretHeight(*m_styles.at(0));
-    m_layout.updateWidthAndAlign();
+    m_layout.updateAfterTyping(position);
     applyShadow();
     m_styles.forgetNextInsert();
 }

@@ -543,6 +543,7 @@ void TouchTextEditor::longPressed()
 void TouchTextEditor::keyPress(QKeyEvent* event)
 {
     m_state.doubleClickedSelection = false;
+    const QTextCursor before = m_surface.selection();
     m_surface.handleByTextItem(QEvent::KeyPress, *event);
     switch (event->key()) {
     case Qt::Key_Left:
@@ -555,7 +556,18 @@ void TouchTextEditor::keyPress(QKeyEvent* event)
     default:
         break;
     }
-    m_surface.repaint();
+    repaintBetween(before, m_surface.selection());
+}
+
+// Repaints what a key changed in the paragraphs of the old and the new caret.
+void TouchTextEditor::repaintBetween(const QTextCursor& before, const QTextCursor& after)
+{
+    if (before.hasSelection() || after.hasSelection() || m_state.handleCaret) {
+        m_surface.repaint();
+        return;
+    }
+    m_surface.repaintBlock(before.position());
+    m_surface.repaintBlock(after.position());
 }
 
 void TouchTextEditor::setCursorPosition(int position)

@@ -59,6 +59,7 @@ private:
     void dragSelection(QGraphicsSceneMouseEvent* event);
     void synchronizeKeyBoardCursorPos();
     void makeMouseMoveYPosInsideTextObject(QGraphicsSceneMouseEvent* event) const;
+    void repaintBetween(const QTextCursor& before, const QTextCursor& after);
     bool filterDrag(const QGraphicsSceneMouseEvent& event);
     // Returns whether editing of the object starts with this tap, so that it places the cursor.
     bool setBoundingRectLineStatus(TouchState::Gesture ended);

@@ -7,8 +7,8 @@
 #include <QString>
 #include <string>
 
-// Saves pictures as files that are never visible half-written. PNG files are written by an encoder of this
-// program, whose compression level takes a fraction of the time of QImage::save.
+// Saves pictures as files that are never visible half-written. Most PNG files are made by PngEncoder, in a
+// fraction of the time of QImage::save.
 class PngWriter
 {
 public:

@@ -13,10 +13,12 @@
 namespace
 {
 
-const std::string LINKS = "<Relationships>"
-                          "<Relationship Id=\"a\" Type=\"x/officeDocument\" Target=\"b.xml\"/></Relationships>";
-const std::string BOOK_LINKS = "<Relationships><Relationship Id=\"a\" Type=\"x/worksheet\" Target=\"s.xml\"/>"
-                               "<Relationship Id=\"b\" Type=\"x/sharedStrings\" Target=\"t.xml\"/></Relationships>";
+const std::string LINKS =
+    "<Relationships>"
+    "<Relationship Id=\"a\" Type=\"x/officeDocument\" Target=\"b.xml\"/></Relationships>";
+const std::string BOOK_LINKS =
+    "<Relationships><Relationship Id=\"a\" Type=\"x/worksheet\" Target=\"s.xml\"/>"
+    "<Relationship Id=\"b\" Type=\"x/sharedStrings\" Target=\"t.xml\"/></Relationships>";
 const std::string BOOK = "<workbook xmlns:r=\"r\"><sheet r:id=\"a\"/></workbook>";
 
 // The shared strings are the part of the input before the first line break.

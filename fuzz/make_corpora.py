@@ -276,8 +276,19 @@ def fields():
     yield "[]"
 
 
+def encoded():
+    white, shade, clear = b"\xff\xff\xff\xff", b"\x30\x20\x10\x80", b"\0\0\0\0"
+    above = b"\0\0\0\0\0"  # the rest of the line as in the line above
+    for form in range(3):
+        yield struct.pack("4B", 0, 0, 0, form) + b"\1" + white
+        yield struct.pack("4B", 63, 0, 3, form) + (b"\x14" + clear + b"\x05" + white + above) * 9
+        yield struct.pack("4B", 130, 1, 200, form) + (b"\xff" + shade + b"\x02" + white) * 40
+        yield struct.pack("4B", 15, 119, 1, form) + (b"\xff" + clear + b"\x01" + shade + above) * 5
+        yield struct.pack("4B", 99, 0, 9, form) + bytes(i * i * 7 % 251 for i in range(5000))
+
+
 TARGETS = {"title": titles, "order": orders, "settings": settings, "paths": paths, "templates": templates,
-           "records": records, "frames": frames, "socket": sockets, "pictures": pictures, "csv": csvs,
+           "records": records, "frames": frames, "socket": sockets, "pictures": pictures, "encoder": encoded, "csv": csvs,
            "jsonlist": json_lists, "xlsx": workbooks, "fields": fields}
 WORDS = ["manifest", "meta-bg", "meta-text", "content", "text-item", "index", "font-style", "last-archive", "PathInfo",
          "file-path", "value=\\\"", "type=\\\"order\\\"", "position-X", "text-align", "item-count", "size=\\\"", "&#x", "&amp;",

@@ -2,17 +2,12 @@
 
 #include "document/Archive.h"
 #include "document/TText.h"
+#include "library/CheckeredPicture.h"
 #include "library/SmallPictures.h"
 
-#include <QBrush>
 #include <QFontMetrics>
-#include <QGraphicsPixmapItem>
-#include <QGraphicsScene>
-#include <QGraphicsView>
 #include <QLabel>
-#include <QPainter>
 #include <QPixmap>
-#include <QPixmapCache>
 #include <QTextLayout>
 #include <QTextOption>
 #include <QtMath>
@@ -41,34 +36,7 @@ const int NARROW_LABEL_WIDTH = 250;
 const int NARROW_LABEL_HEIGHT = 24;
 const int NARROW_PADDING_X = 12;
 const int NARROW_PADDING_TOP = 8;
-const int HANDLE_GAP = 6;      // between the text and the handle for move mode
-const int CHECKER_SQUARE = 15; // pixels
-
-QPixmap checkerPicture()
-{
-    const QPixmap checker(QStringLiteral(":/checker"));
-    if (!checker.isNull())
-        return checker;
-    // Transparency has to differ from black even without the compiled-in picture.
-    QPixmap drawn(2 * CHECKER_SQUARE, 2 * CHECKER_SQUARE);
-    drawn.fill(QColor(102, 102, 102));
-    QPainter painter(&drawn);
-    painter.fillRect(0, 0, CHECKER_SQUARE, CHECKER_SQUARE, QColor(153, 153, 153));
-    painter.fillRect(CHECKER_SQUARE, CHECKER_SQUARE, CHECKER_SQUARE, CHECKER_SQUARE, QColor(153, 153, 153));
-    return drawn;
-}
-
-// Cached for all items: finding the picture among the resources takes longer than painting it.
-QBrush checkerBrush()
-{
-    const QString key = QStringLiteral("ArchiveItem checker");
-    QPixmap checker;
-    if (!QPixmapCache::find(key, &checker)) {
-        checker = checkerPicture();
-        QPixmapCache::insert(key, checker);
-    }
-    return QBrush(checker);
-}
+const int HANDLE_GAP = 6; // between the text and the handle for move mode
 
 } // namespace
 
@@ -138,20 +106,11 @@ void ArchiveItem::fitLinesToHandle()
 
 void ArchiveItem::createLeftChild()
 {
-    m_scene = new QGraphicsScene(0, 0, LEFT_CHILD_WIDTH, CHILD_HEIGHT, this);
-    m_scene->setBackgroundBrush(checkerBrush());
-    m_pixmapItem = m_scene->addPixmap(QPixmap());
-    // The parent and the style sheet are set first: a widget is styled again, with its children, when either
-    // changes later.
-    auto* view = new QGraphicsView(m_scene, this);
-    view->setStyleSheet(QStringLiteral("border:0;"));
-    view->setEnabled(false);
-    view->setHorizontalScrollBarPolicy(Qt::ScrollBarAlwaysOff);
-    view->setVerticalScrollBarPolicy(Qt::ScrollBarAlwaysOff);
-    view->setFixedSize(LEFT_CHILD_WIDTH, CHILD_HEIGHT);
-    setChild(view, CHILD_LEFT);
-    view->move(LEFT_CHILD_POS);
-    view->show();
+    m_picture = new CheckeredPicture(this);
+    m_picture->setFixedSize(PICTURE_SIZE);
+    setChild(m_picture, CHILD_LEFT);
+    m_picture->move(LEFT_CHILD_POS);
+    m_picture->show();
 }
 
 void ArchiveItem::createRightChild()
@@ -193,13 +152,13 @@ void ArchiveItem::updateContents(QImage image)
 
 void ArchiveItem::updateLeftChild(QImage image)
 {
-    if (!m_pixmapItem || !m_archive)
+    if (!m_picture || !m_archive)
         return;
     if (image.isNull())
         image = SmallPictures::read(m_archive->getFullPathOfThumbnailSmall(), PICTURE_SIZE);
     else
         image = SmallPictures::fitted(image, PICTURE_SIZE);
-    m_pixmapItem->setPixmap(image.isNull() ? QPixmap() : QPixmap::fromImage(image));
+    m_picture->setPicture(image.isNull() ? QPixmap() : QPixmap::fromImage(image));
 }
 
 void ArchiveItem::updateRightChild()
@@ -283,8 +242,8 @@ ArchiveItem* ArchiveItem::clone()
     auto* item = new ArchiveItem(archive.get(), m_type);
     item->m_ownArchive = std::move(archive);
     item->initArchiveItemChildWidget();
-    if (m_pixmapItem && item->m_pixmapItem)
-        item->m_pixmapItem->setPixmap(m_pixmapItem->pixmap()); // the pixmap may be newer than the file
+    if (m_picture && item->m_picture)
+        item->m_picture->setPicture(m_picture->picture()); // the picture may be newer than the file
     item->setSelected(isSelected());
     item->setStyleSheet(isSelected() ? OPERATE_AND_SELECT_STATE : OPERATE_AND_UN_SELECT_STATE);
     return item;

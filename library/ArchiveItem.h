@@ -9,9 +9,7 @@
 #include <memory>
 
 class Archive;
-class QGraphicsPixmapItem;
-class QGraphicsScene;
-class QGraphicsView;
+class CheckeredPicture;
 class QLabel;
 
 // One title in the list: its thumbnail on a checker pattern, and the first lines of its texts.
@@ -95,8 +93,7 @@ private:
     std::unique_ptr<Archive> m_ownArchive; // set in clones only
     int m_type;
     int m_holds = 0;
-    QGraphicsScene* m_scene = nullptr;
-    QGraphicsPixmapItem* m_pixmapItem = nullptr;
+    CheckeredPicture* m_picture = nullptr;
     QWidget* m_textWidget = nullptr;
     QList<QLabel*> m_labels;
 };

@@ -354,8 +354,8 @@ void ArchiveList::prepareOrder()
     m_cleanUp = m_controller->prepareOrder(m_currentPath) ? CleanUp::Allowed : CleanUp::Withheld;
 }
 
-// Takes the lock of the current folder unless it is held. The operator is not kept waiting for another program
-// that has it: the list goes on and tries again with the next title.
+// Takes the lock of the current folder unless it is held. The operator is not kept waiting for another
+// program that has it: the list goes on and tries again with the next title.
 void ArchiveList::lockFolder()
 {
     m_folderLock.take(m_currentPath.toStdString(), FolderLock::Kind::Exclusive);

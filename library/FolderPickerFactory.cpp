@@ -9,7 +9,6 @@
 
 #include <QDateTime>
 #include <QDir>
-#include <QIcon>
 #include <QModelIndex>
 
 const QString FolderPickerFactory::DATE_FORMAT = QStringLiteral("yyyy-MM-dd hh:mm");
@@ -244,7 +243,7 @@ void FolderPickerFactory::setDecorationAttribute(KSModelAttributeItem* item, boo
     if (!folder)
         return;
     item->setAttributeMaxKey(Qt::DecorationRole, DateColumn);
-    item->setAttribute(Qt::DecorationRole, QIcon(FOLDER_ICON), NameColumn);
+    item->setAttribute(Qt::DecorationRole, m_folderIcon, NameColumn);
 }
 
 void FolderPickerFactory::setEditAttribute(KSModelAttributeItem* item, const QString& name) const

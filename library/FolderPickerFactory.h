@@ -6,8 +6,10 @@
 #include <QFileInfo>
 #include <QFont>
 #include <QHash>
+#include <QIcon>
 #include <QList>
 #include <QMap>
+#include <QPixmap>
 #include <QString>
 #include <QStringList>
 
@@ -87,6 +89,7 @@ private:
     FolderPickerController m_disk;
     QString m_rootPath;
     QFont m_font;
+    QIcon m_folderIcon{QPixmap(FOLDER_ICON)};
     QList<int> m_folders;                     // in display order
     QHash<QString, int> m_numbers;            // by name, of all folders seen so far
     QMap<int, QString> m_folderNames;         // names by number

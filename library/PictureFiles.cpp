@@ -31,10 +31,10 @@ bool PictureFiles::write(const Archive& archive, const QImage& big, const QImage
         const QSize size = PictureThread::THUMBNAIL_SMALL_SIZE;
         ImageResizer resizer;
         resizer.keepRefusedFor(title);
-        const bool areReduced =
-            resizer.resizeImageToThumbnail(middle, path(archive, archive.getThumbnailBlack()).toStdWString(),
-                                           path(archive, archive.getThumbnailSmall()).toStdWString(),
-                                           static_cast<unsigned>(size.width()), static_cast<unsigned>(size.height()));
+        const bool areReduced = resizer.resizeImageToThumbnail(
+            middle, path(archive, archive.getThumbnailBlack()).toStdWString(),
+            path(archive, archive.getThumbnailSmall()).toStdWString(), static_cast<unsigned>(size.width()),
+            static_cast<unsigned>(size.height()));
         isWritten = areReduced && isWritten;
     }
     return (!bigWritten.valid() || bigWritten.get()) && isWritten;

@@ -7,8 +7,8 @@
 
 class Archive;
 
-// Writes the four pictures of a title beside its file. Each is replaced when the new one is complete; the disk
-// may sync it later. Any thread.
+// Writes the four pictures of a title beside its file. Each is replaced when the new one is complete; the
+// disk may sync it later. Any thread.
 class PictureFiles
 {
 public:
@@ -22,8 +22,8 @@ public:
 
     PictureFiles() = delete;
 
-    // Writes the pictures under the names in the record; skips those whose names are not valid. Returns whether
-    // all of them are in place. Those that the disk refuses are kept by RefusedWrites.
+    // Writes the pictures under the names in the record; skips those whose names are not valid. Returns
+    // whether all of them are in place. Those that the disk refuses are kept by RefusedWrites.
     static bool write(const Archive& archive, const QImage& big, const QImage& middle,
                       Pictures pictures = Pictures(ALL));
 

@@ -9,8 +9,8 @@ class Archive;
 class GraphicsPixmap;
 class GraphicsText;
 
-// A title laid out for air: a scene of 1920x1080 with the background and the text objects as they are drawn into
-// the big picture. Filled, drawn and cleared for each title. GUI thread only; needs no window.
+// A title laid out for air: a scene of 1920x1080 with the background and the text objects as they are drawn
+// into the big picture. Filled, drawn and cleared for each title. GUI thread only; needs no window.
 class RasterScene
 {
 public:

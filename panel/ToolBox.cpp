@@ -4,6 +4,7 @@
 
 #include <QHBoxLayout>
 #include <QLabel>
+#include <QPixmap>
 
 #include <algorithm>
 
@@ -167,12 +168,13 @@ void ToolBox::setButtonChosen(KSPushbutton* button)
         showIcon(*entry);
 }
 
-// Reads and decodes each icon file once.
+// Reads and decodes each icon file once. From a name without suffix, an icon would read the database of MIME
+// types.
 QIcon ToolBox::iconOf(Button& entry, const QString& name)
 {
     auto known = entry.icons.find(name);
     if (known == entry.icons.end())
-        known = entry.icons.insert(name, QIcon(name));
+        known = entry.icons.insert(name, QIcon(QPixmap(name)));
     return *known;
 }
 

@@ -2,12 +2,12 @@
 
 #include <string>
 
-// Keeps two programs from working on the same folder at once: the titler holds an exclusive lock on the folder
-// that it has open, other programs ask for one before they write there.
+// Keeps two programs from working on the same folder at once: the titler holds an exclusive lock on the
+// folder that it has open, other programs ask for one before they write there.
 //
 // The lock is an advisory one on the folder itself. It leaves no file, is not copied with the folder, follows
-// the folder when it is renamed, and ends with the process, however that ends. Not synchronised: one thread at
-// a time.
+// the folder when it is renamed, and ends with the process, however that ends. Not synchronised: one thread
+// at a time.
 class FolderLock
 {
 public:

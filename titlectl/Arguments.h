@@ -12,9 +12,9 @@
 class Arguments
 {
 public:
-    // Splits the words: "--name VALUE" and "--name=VALUE" for options with a value, "--name" for switches, and
-    // operands between them; behind "--" all words are operands. Returns nothing, with a reason in error, for
-    // an option that is not known, one without its value, and a switch with a value.
+    // Splits the words: "--name VALUE" and "--name=VALUE" for options with a value, "--name" for switches,
+    // and operands between them; behind "--" all words are operands. Returns nothing, with a reason in error,
+    // for an option that is not known, one without its value, and a switch with a value.
     static std::optional<Arguments> parse(const QStringList& words, const QList<CommandOption>& options,
                                           QString& error);
 

@@ -36,7 +36,8 @@ void report(const FindingList& findings, qsizetype titles, Output& output)
                                 {QStringLiteral("reason"), finding.reason}});
     }
     output.line(QStringLiteral("%1 titles, %2 findings").arg(titles).arg(findings.size()));
-    output.json(QJsonDocument(QJsonObject{{QStringLiteral("titles"), titles}, {QStringLiteral("findings"), list}}));
+    output.json(
+        QJsonDocument(QJsonObject{{QStringLiteral("titles"), titles}, {QStringLiteral("findings"), list}}));
 }
 
 } // namespace

@@ -7,8 +7,8 @@
 class CheckedFolder;
 class CheckedTitle;
 
-// One rule of the check before air. Rules of folders are applied to whole folders, rules of titles to each title
-// that the folder's order names.
+// One rule of the check before air. Rules of folders are applied to whole folders, rules of titles to each
+// title that the folder's order names.
 struct CheckRule {
     QString id;      // as in --without
     QString summary; // one line without a full stop

@@ -18,12 +18,11 @@ CheckedFolder::CheckedFolder(QString path) : m_path(std::move(path))
         m_rows.append(QString::fromStdString(row.getArchivePath()));
     const QStringList entries =
         QDir(m_path).entryList(QDir::Files | QDir::Hidden | QDir::System, QDir::Name); // also broken links
-    for (const QString& name : entries) {
+    for (const QString& name : entries)
         if (ArchiveManager::isTitleFile(name.toStdString()))
             m_titleFiles.append(name);
         else
             m_otherFiles.append(name);
-    }
     for (const QString& name : std::as_const(m_titleFiles))
         collectNames(name);
 }
@@ -43,7 +42,6 @@ void CheckedFolder::collectNames(const QString& titleFile)
 
 bool CheckedFolder::isNamedByTitle(const QString& name) const
 {
-    return m_named.contains(name) ||
-           std::any_of(m_unreadableStems.begin(), m_unreadableStems.end(),
-                       [&](const QString& stem) { return name.startsWith(stem); });
+    return m_named.contains(name) || std::any_of(m_unreadableStems.begin(), m_unreadableStems.end(),
+                                                 [&](const QString& stem) { return name.startsWith(stem); });
 }

@@ -7,7 +7,8 @@
 #include <QString>
 #include <QStringList>
 
-// A folder of titles as it is on the disk, for the rules of the check. Read once by the constructor; any thread.
+// A folder of titles as it is on the disk, for the rules of the check. Read once by the constructor; any
+// thread.
 class CheckedFolder
 {
 public:

@@ -1,13 +1,14 @@
 #include "titlectl/CheckedTitle.h"
 
 #include "document/TitleParser.h"
-#include "titlectl/TitleInk.h"
 #include "titlectl/PictureStates.h"
+#include "titlectl/TitleInk.h"
 
 #include <QFileInfo>
 #include <utility>
 
-CheckedTitle::CheckedTitle(QString path) : m_path(std::move(path)), m_changed(QFileInfo(m_path).lastModified())
+CheckedTitle::CheckedTitle(QString path)
+    : m_path(std::move(path)), m_changed(QFileInfo(m_path).lastModified())
 {
     m_isReadable = TitleParser().readOneTitle(m_path.toStdString(), &m_archive) == 1;
     if (!m_isReadable)

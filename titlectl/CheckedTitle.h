@@ -22,7 +22,8 @@ public:
     // Returns whether the file could be read; if not, the record is empty.
     bool isReadable() const { return m_isReadable; }
     const Archive& archive() const { return m_archive; }
-    // Return what the texts draw and what is wrong with the picture files; found out when it is first asked for.
+    // Return what the texts draw and what is wrong with the picture files; found out when it is first asked
+    // for.
     const TitleInk& ink() const;
     const PictureStates& pictures() const;
 

@@ -26,7 +26,8 @@ public:
 
 private:
     template <typename Subject>
-    void apply(void (*CheckRule::*function)(const Subject&, FindingList&), const Subject& subject, FindingList& all) const;
+    void apply(void (*CheckRule::*function)(const Subject&, FindingList&), const Subject& subject,
+               FindingList& all) const;
 
     QList<CheckRule> m_rules;
 };

@@ -16,7 +16,8 @@ public:
     enum ExitCode {
         Success = 0,
         Findings = 1, // something is wrong with the titles, or could not be done
-        WrongUse = 2, // nothing was done: a wrong command line, a path that does not exist, or a folder in use
+        WrongUse =
+            2, // nothing was done: a wrong command line, a path that does not exist, or a folder in use
     };
     // What stands behind the options.
     struct Operands {

@@ -10,5 +10,8 @@ struct CommandOption {
 
     bool hasValue() const { return !value.isEmpty(); }
     // Returns "--name" or "--name VALUE".
-    QString synopsis() const { return QStringLiteral("--") + name + (hasValue() ? QLatin1Char(' ') + value : QString()); }
+    QString synopsis() const
+    {
+        return QStringLiteral("--") + name + (hasValue() ? QLatin1Char(' ') + value : QString());
+    }
 };

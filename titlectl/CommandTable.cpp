@@ -39,7 +39,8 @@ Command* CommandTable::find(const QString& name) const
 
 QList<CommandOption> CommandTable::optionsOf(const Command& command)
 {
-    return command.options() + QList<CommandOption>{{JSON, QString(), QStringLiteral("write the result as JSON")}};
+    return command.options() +
+           QList<CommandOption>{{JSON, QString(), QStringLiteral("write the result as JSON")}};
 }
 
 int CommandTable::run(const QStringList& words, QIODevice& result, QIODevice& messages, bool isTerminal) const

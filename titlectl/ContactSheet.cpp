@@ -49,7 +49,8 @@ void setTextSize(QPainter& painter, double height)
 
 void drawElided(QPainter& painter, const QRectF& place, Qt::Alignment align, const QString& text)
 {
-    const QString shown = QFontMetricsF(painter.font(), painter.device()).elidedText(text, Qt::ElideMiddle, place.width());
+    const QString shown =
+        QFontMetricsF(painter.font(), painter.device()).elidedText(text, Qt::ElideMiddle, place.width());
     painter.drawText(place, static_cast<int>(align | Qt::AlignVCenter) | Qt::TextSingleLine, shown);
 }
 
@@ -90,7 +91,8 @@ QString ContactSheet::writePdf(const QString& path, const Drawn& drawn)
         QPdfWriter writer(&file);
         writer.setResolution(DOTS_PER_INCH);
         writer.setTitle(m_heading);
-        writer.setPageLayout(QPageLayout(QPageSize(QPageSize::A4), QPageLayout::Landscape, QMarginsF(0, 0, 0, 0)));
+        writer.setPageLayout(
+            QPageLayout(QPageSize(QPageSize::A4), QPageLayout::Landscape, QMarginsF(0, 0, 0, 0)));
         QPainter painter(&writer);
         painter.setRenderHint(QPainter::SmoothPixmapTransform);
         for (int page = 0; page < pages(); ++page) {
@@ -123,7 +125,8 @@ void ContactSheet::drawPage(QPainter& painter, int page, const Drawn& drawn)
     const SheetLayout layout{QSizeF(PAGE)};
     setTextSize(painter, layout.heading().height());
     drawElided(painter, layout.heading(), Qt::AlignLeft, m_heading);
-    drawElided(painter, layout.heading(), Qt::AlignRight, QStringLiteral("%1 / %2").arg(page + 1).arg(pages()));
+    drawElided(painter, layout.heading(), Qt::AlignRight,
+               QStringLiteral("%1 / %2").arg(page + 1).arg(pages()));
     setTextSize(painter, layout.nameHeight());
     const int first = page * SheetLayout::PER_PAGE;
     const int behind = qMin(first + SheetLayout::PER_PAGE, static_cast<int>(m_titles.size()));

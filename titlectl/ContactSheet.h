@@ -7,7 +7,8 @@
 
 class QPainter;
 
-// The contact sheet of a folder: its titles with their names, in order, on pages of A4 across. GUI thread only.
+// The contact sheet of a folder: its titles with their names, in order, on pages of A4 across. GUI thread
+// only.
 class ContactSheet
 {
 public:
@@ -22,7 +23,8 @@ public:
     // wrong, or an empty string.
     QString write(const QString& path, const Drawn& drawn);
 
-    // Returns the titles that were drawn as an empty box, since neither a picture nor the title could be read.
+    // Returns the titles that were drawn as an empty box, since neither a picture nor the title could be
+    // read.
     const QStringList& unreadable() const { return m_unreadable; }
     int pages() const;
     // Returns the path of a page among several that are pictures.

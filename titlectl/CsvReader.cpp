@@ -209,7 +209,8 @@ void setHeader(ListTable& table, const CsvReader::Row& row, int line)
 
 QChar CsvReader::separatorOf(QStringView text)
 {
-    static constexpr std::array<QChar, 3> SEPARATORS = {QLatin1Char(','), QLatin1Char(';'), QLatin1Char('\t')};
+    static constexpr std::array<QChar, 3> SEPARATORS = {QLatin1Char(','), QLatin1Char(';'),
+                                                        QLatin1Char('\t')};
     std::array<int, 3> counts = {};
     bool isQuoted = false;
     for (const QChar c : text.left(ListTable::CELL_LIMIT)) {
@@ -242,12 +243,13 @@ ListTable CsvReader::read(QIODevice& device)
             separator = separatorOf(window.text());
         const Row row = rowAt(window.text(), separator);
         if (row.state == Row::State::TooLong) {
-            table.fail(QStringLiteral("line %1: A cell is longer than %2 bytes, the row longer than %3 bytes, or it "
-                                      "has more than %4 columns")
-                           .arg(line)
-                           .arg(ListTable::CELL_LIMIT)
-                           .arg(ListTable::ROW_BYTES_LIMIT)
-                           .arg(ListTable::COLUMN_LIMIT));
+            table.fail(
+                QStringLiteral("line %1: A cell is longer than %2 bytes, the row longer than %3 bytes, or it "
+                               "has more than %4 columns")
+                    .arg(line)
+                    .arg(ListTable::CELL_LIMIT)
+                    .arg(ListTable::ROW_BYTES_LIMIT)
+                    .arg(ListTable::COLUMN_LIMIT));
             break;
         }
         if (isHeader)

@@ -8,9 +8,10 @@ bool FolderLocks::take(const QStringList& folders, FolderLock::Kind kind, InUse 
         auto lock = std::make_unique<FolderLock>();
         // A file system without locks is used without one.
         if (lock->take(folder.toStdString(), kind) == FolderLock::Result::Busy && inUse == InUse::Refuse) {
-            output.message(QStringLiteral("%1 is in use: the titler has it open, or another program works on it "
-                                          "(--force goes on all the same)")
-                               .arg(folder));
+            output.message(
+                QStringLiteral("%1 is in use: the titler has it open, or another program works on it "
+                               "(--force goes on all the same)")
+                    .arg(folder));
             return false;
         }
         m_locks.push_back(std::move(lock));

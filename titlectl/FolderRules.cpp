@@ -25,7 +25,8 @@ void checkOrderNames(const CheckedFolder& folder, FindingList& findings)
     QSet<QString> seen;
     for (const QString& row : folder.rows()) {
         if (!QFileInfo::exists(folder.pathOf(row)) || row.isEmpty())
-            findings.append({folder.pathOf(ORDER), row, {}, QStringLiteral("the order names a title that is not there")});
+            findings.append(
+                {folder.pathOf(ORDER), row, {}, QStringLiteral("the order names a title that is not there")});
         else if (seen.contains(row))
             findings.append({folder.pathOf(ORDER), row, {}, QStringLiteral("the order names a title twice")});
         seen.insert(row);
@@ -40,19 +41,23 @@ void checkOrderOmits(const CheckedFolder& folder, FindingList& findings)
         return;
     for (const QString& name : folder.titleFiles())
         if (!folder.rows().contains(name))
-            findings.append({folder.pathOf(name), {}, {},
+            findings.append({folder.pathOf(name),
+                             {},
+                             {},
                              QStringLiteral("the order does not name the title; the titler will remove it")});
 }
 
 // Returns what kind of leftover the file is; empty if it is none.
 QString leftoverKind(const CheckedFolder& folder, const QString& name)
 {
-    static const QSet<QString> PICTURES = {QStringLiteral("png"), QStringLiteral("jpg"), QStringLiteral("jpeg"),
-                                           QStringLiteral("jpe"), QStringLiteral("bmp"), QStringLiteral("gif"),
-                                           QStringLiteral("tif"), QStringLiteral("tiff")};
+    static const QSet<QString> PICTURES = {
+        QStringLiteral("png"), QStringLiteral("jpg"), QStringLiteral("jpeg"), QStringLiteral("jpe"),
+        QStringLiteral("bmp"), QStringLiteral("gif"), QStringLiteral("tif"),  QStringLiteral("tiff")};
     const std::string bytes = name.toStdString();
     if (HiddenName::isTemporary(bytes))
-        return HiddenName::hasLivingOwner(bytes) ? QString() : QStringLiteral("a save that was interrupted left this file");
+        return HiddenName::hasLivingOwner(bytes)
+                   ? QString()
+                   : QStringLiteral("a save that was interrupted left this file");
     if (!HiddenName::keptTarget(bytes).empty())
         return QStringLiteral("an earlier version that a save kept was not removed");
     if (PICTURES.contains(QFileInfo(name).suffix().toLower()) && !folder.isNamedByTitle(name))
@@ -74,9 +79,12 @@ QList<CheckRule> FolderRules::table()
     return {{QStringLiteral("order-unreadable"), QStringLiteral("the order file is torn or cannot be read"),
              checkOrderReadable, nullptr},
             {QStringLiteral("order-names-missing"),
-             QStringLiteral("the order file names a title that is not there, or one twice"), checkOrderNames, nullptr},
-            {QStringLiteral("order-omits"), QStringLiteral("the order file omits a title that is there, or is missing"),
-             checkOrderOmits, nullptr},
-            {QStringLiteral("leftover"), QStringLiteral("a file that belongs to no title or that a save left behind"),
-             checkLeftovers, nullptr}};
+             QStringLiteral("the order file names a title that is not there, or one twice"), checkOrderNames,
+             nullptr},
+            {QStringLiteral("order-omits"),
+             QStringLiteral("the order file omits a title that is there, or is missing"), checkOrderOmits,
+             nullptr},
+            {QStringLiteral("leftover"),
+             QStringLiteral("a file that belongs to no title or that a save left behind"), checkLeftovers,
+             nullptr}};
 }

@@ -11,8 +11,8 @@ class QString;
 class JsonListReader
 {
 public:
-    // bytes: UTF-8, with or without a byte order mark. Only one object at a time is parsed, so that the memory
-    // is bounded whatever the bytes contain.
+    // bytes: UTF-8, with or without a byte order mark. Only one object at a time is parsed, so that the
+    // memory is bounded whatever the bytes contain.
     static ListTable read(const QByteArray& bytes);
 
     // Returns a number as it is usually written: 12, 1.5 or 0.001.

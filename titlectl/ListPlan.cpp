@@ -24,8 +24,8 @@
 namespace
 {
 
-// Characters of the readable part of a file name; the name with the ending of a picture has to be short enough
-// for the disk.
+// Characters of the readable part of a file name; the name with the ending of a picture has to be short
+// enough for the disk.
 constexpr int READABLE_LENGTH = 40;
 constexpr int HASH_LENGTH = 12;
 constexpr int ROW_DIGITS = 6;
@@ -108,7 +108,8 @@ bool ListPlan::planParts(Filling& filling, const QStringList& names)
     for (const QString& name : names) {
         const int column = m_source.table.columnOf(name);
         if (column < 0) {
-            m_error = QStringLiteral("The list has no column \"%1\" for \"{%1}\" in text %2").arg(name, QString::number(filling.id));
+            m_error = QStringLiteral("The list has no column \"%1\" for \"{%1}\" in text %2")
+                          .arg(name, QString::number(filling.id));
             return false;
         }
         filling.parts.insert(name, column);
@@ -182,7 +183,9 @@ QString ListPlan::stemOf(int row) const
                              : readable(key) + QLatin1Char('_') + hashOf(column + QLatin1Char('\n') + key);
     }
     const QString list = QFileInfo(m_source.listPath).completeBaseName();
-    return QStringLiteral("%1_%2_%3").arg(readable(list), hashOf(list)).arg(row + 1, ROW_DIGITS, 10, QLatin1Char('0'));
+    return QStringLiteral("%1_%2_%3")
+        .arg(readable(list), hashOf(list))
+        .arg(row + 1, ROW_DIGITS, 10, QLatin1Char('0'));
 }
 
 QString ListPlan::fillText(int row, const Filling& filling, TText& text) const
@@ -204,7 +207,8 @@ QString ListPlan::fillText(int row, const Filling& filling, TText& text) const
     }
     if (field.fit && !TextFit::shrink(text, *field.fit)) {
         return QStringLiteral("field \"%1\" is %2 pixels wide at the smallest size, %3 is the limit")
-            .arg(field.name, QString::number(int(TextFit::inkWidth(text))), QString::number(field.fit->width));
+            .arg(field.name, QString::number(int(TextFit::inkWidth(text))),
+                 QString::number(field.fit->width));
     }
     TextFit::keepAlignment(text, before);
     return {};
@@ -216,19 +220,19 @@ QString ListPlan::fill(int row, Archive& title) const
         if (const QString reason = fillText(row, filling, *title.text()[filling.index]); !reason.isEmpty())
             return reason;
     std::vector<TText*> kept;
-    for (TText* text : title.text()) {
+    for (TText* text : title.text())
         if (TextFields::isBlank(*text))
             delete text;
         else
             kept.push_back(text);
-    }
     title.setText(kept);
     return kept.empty() && picture(row).isEmpty() ? QStringLiteral("it has no text") : QString();
 }
 
 QString ListPlan::picture(int row) const
 {
-    const QString name = m_pictureColumn < 0 ? QString() : m_source.table.cell(row, m_pictureColumn).trimmed();
+    const QString name =
+        m_pictureColumn < 0 ? QString() : m_source.table.cell(row, m_pictureColumn).trimmed();
     if (name.isEmpty() || QFileInfo(name).isAbsolute())
         return name;
     return QFileInfo(m_source.listPath).path() + QLatin1Char('/') + name;
@@ -255,7 +259,8 @@ std::unique_ptr<Archive> ListPlan::title(int row) const
     auto title = std::make_unique<Archive>(m_source.sample);
     fill(row, *title);
     title->setName(stem.toStdString());
-    title->setPath((m_source.folder + QLatin1Char('/') + stem + TitleFileOperations::XML_EXTENSION).toStdString());
+    title->setPath(
+        (m_source.folder + QLatin1Char('/') + stem + TitleFileOperations::XML_EXTENSION).toStdString());
     title->setThumbnailBig((stem + TitleFileOperations::THUMBNAIL_BIG).toStdString());
     title->setThumbnailMiddle((stem + TitleFileOperations::THUMBNAIL_MIDDLE).toStdString());
     title->setThumbnailSmall((stem + TitleFileOperations::THUMBNAIL_SMALL).toStdString());

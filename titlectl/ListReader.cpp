@@ -23,7 +23,8 @@ ListTable ListReader::read(const QString& path)
     const QFileInfo info(path);
     QFile file(path);
     if (!info.isFile()) {
-        refused.fail(info.exists() ? QStringLiteral("It is not a file") : QStringLiteral("There is no such file"));
+        refused.fail(info.exists() ? QStringLiteral("It is not a file")
+                                   : QStringLiteral("There is no such file"));
     } else if (info.size() > ListTable::FILE_LIMIT) {
         refused.fail(QStringLiteral("The file is longer than %1 bytes").arg(ListTable::FILE_LIMIT));
     } else if (!file.open(QIODevice::ReadOnly)) {

@@ -14,7 +14,7 @@ public:
     // error.
     static ListTable read(const QString& path);
 
-    // Returns the format that the ending of the name says: .json or .xlsx, ignoring case, else comma separated
-    // values.
+    // Returns the format that the ending of the name says: .json or .xlsx, ignoring case, else comma
+    // separated values.
     static Format formatOf(const QString& path);
 };

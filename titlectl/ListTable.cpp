@@ -71,15 +71,14 @@ void ListTable::setHeader(const QStringList& names)
 int ListTable::addColumn(const QString& name)
 {
     const QString clean = withPlainLineBreaks(name).trimmed();
-    if (columnCount() == COLUMN_LIMIT) {
+    if (columnCount() == COLUMN_LIMIT)
         fail(QStringLiteral("The list has more than %1 columns").arg(COLUMN_LIMIT));
-    } else if (const QString reason = unusable(clean); !reason.isEmpty()) {
+    else if (const QString reason = unusable(clean); !reason.isEmpty())
         fail(QStringLiteral("The header cannot be used: %1").arg(reason));
-    } else if (clean.toUtf8().size() > CELL_LIMIT) {
+    else if (clean.toUtf8().size() > CELL_LIMIT)
         fail(QStringLiteral("The name of a column is longer than %1 bytes").arg(CELL_LIMIT));
-    } else if (!clean.isEmpty() && m_columns.contains(folded(clean))) {
+    else if (!clean.isEmpty() && m_columns.contains(folded(clean)))
         fail(QStringLiteral("Two columns are named \"%1\"").arg(clean));
-    }
     if (hasFailed())
         return -1;
     if (!clean.isEmpty())

@@ -38,8 +38,7 @@ QString lastError()
 // Returns the picture scaled to fill the size, without what reaches beyond it.
 QImage filling(const QImage& picture, QSize size)
 {
-    const QImage scaled =
-        picture.scaled(size, Qt::KeepAspectRatioByExpanding, Qt::SmoothTransformation);
+    const QImage scaled = picture.scaled(size, Qt::KeepAspectRatioByExpanding, Qt::SmoothTransformation);
     const QPoint corner((scaled.width() - size.width()) / 2, (scaled.height() - size.height()) / 2);
     return scaled.copy(QRect(corner, size));
 }

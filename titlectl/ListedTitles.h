@@ -11,8 +11,8 @@
 class Archive;
 class TitleStage;
 
-// Makes the titles of a plan in their folder, each with all of its files or none, and names the new ones at the
-// end of the order of the folder. GUI thread only.
+// Makes the titles of a plan in their folder, each with all of its files or none, and names the new ones at
+// the end of the order of the folder. GUI thread only.
 class ListedTitles
 {
 public:
@@ -22,8 +22,8 @@ public:
     // All are kept as references. The folder exists and is locked for this program.
     ListedTitles(const ListPlan& plan, const Archive& sample, const QString& folder);
 
-    // Makes the titles of all rows that are not wrong, in as many processes. Calls oneDone after each. Returns
-    // for each row of the plan what went wrong with it, or an empty string.
+    // Makes the titles of all rows that are not wrong, in as many processes. Calls oneDone after each.
+    // Returns for each row of the plan what went wrong with it, or an empty string.
     QStringList make(int processes, const std::function<void()>& oneDone);
 
 private:

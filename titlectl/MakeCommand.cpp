@@ -30,10 +30,9 @@ const QString STRICT = QStringLiteral("strict");
 QString titleFileOf(const QString& path)
 {
     const QFileInfo info(path);
-    const QString file = info.isDir()
-                             ? path + QLatin1Char('/') + TitleFileOperations::TEMPLATE_STEM +
-                                   TitleFileOperations::XML_EXTENSION
-                             : path;
+    const QString file = info.isDir() ? path + QLatin1Char('/') + TitleFileOperations::TEMPLATE_STEM +
+                                            TitleFileOperations::XML_EXTENSION
+                                      : path;
     return QDir::cleanPath(QFileInfo(file).absoluteFilePath());
 }
 
@@ -123,8 +122,7 @@ int MakeCommand::report(const ListPlan& plan, const QStringList& errors, bool is
     for (std::size_t i = 0; i < plan.rows().size(); ++i) {
         const ListPlan::Row& row = plan.rows()[i];
         const QString reason = row.reason.isEmpty() ? errors.at(qsizetype(i)) : row.reason;
-        const QString outcome =
-            nameOf(reason.isEmpty() ? row.outcome : ListPlan::Outcome::Wrong, isDone);
+        const QString outcome = nameOf(reason.isEmpty() ? row.outcome : ListPlan::Outcome::Wrong, isDone);
         rows.append(QJsonObject{{QStringLiteral("line"), row.line},
                                 {QStringLiteral("title"), row.stem},
                                 {QStringLiteral("outcome"), outcome},

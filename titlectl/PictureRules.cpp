@@ -8,7 +8,8 @@ namespace
 
 using State = PictureStates::State;
 
-template <State wanted> void check(const CheckedTitle& title, FindingList& findings)
+template <State wanted>
+void check(const CheckedTitle& title, FindingList& findings)
 {
     if (!title.isReadable())
         return;
@@ -21,10 +22,11 @@ template <State wanted> void check(const CheckedTitle& title, FindingList& findi
 
 QList<CheckRule> PictureRules::table()
 {
-    return {{QStringLiteral("picture-missing"), QStringLiteral("a picture or the background of a title is missing"),
-             nullptr, check<State::Missing>},
-            {QStringLiteral("picture-torn"), QStringLiteral("a picture or the background cannot be decoded"), nullptr,
-             check<State::Torn>},
+    return {{QStringLiteral("picture-missing"),
+             QStringLiteral("a picture or the background of a title is missing"), nullptr,
+             check<State::Missing>},
+            {QStringLiteral("picture-torn"), QStringLiteral("a picture or the background cannot be decoded"),
+             nullptr, check<State::Torn>},
             {QStringLiteral("picture-size"), QStringLiteral("a picture has the wrong size"), nullptr,
              check<State::WrongSize>},
             {QStringLiteral("picture-old"), QStringLiteral("a picture is older than its title"), nullptr,

@@ -10,21 +10,24 @@ namespace
 {
 
 const QString SUMMARY = QStringLiteral("renders, checks, shows and changes titles without a window");
-const QString EXIT_CODES = QStringLiteral("0: done; 1: something was found or could not be done; 2: wrong use, or a "
-                                          "folder that the titler has open");
+const QString EXIT_CODES =
+    QStringLiteral("0: done; 1: something was found or could not be done; 2: wrong use, or a "
+                   "folder that the titler has open");
 
 // Protects what the language of manual pages would interpret.
 QString forMan(QString text)
 {
     text.replace(QLatin1Char('\\'), QLatin1String("\\e"));
     text.replace(QLatin1Char('-'), QLatin1String("\\-"));
-    return text.startsWith(QLatin1Char('.')) || text.startsWith(QLatin1Char('\'')) ? QStringLiteral("\\&") + text
-                                                                                   : text;
+    return text.startsWith(QLatin1Char('.')) || text.startsWith(QLatin1Char('\''))
+               ? QStringLiteral("\\&") + text
+               : text;
 }
 
 QString columns(const QString& left, const QString& right, int width)
 {
-    return QStringLiteral("  ") + left.leftJustified(width) + QStringLiteral("  ") + right + QLatin1Char('\n');
+    return QStringLiteral("  ") + left.leftJustified(width) + QStringLiteral("  ") + right +
+           QLatin1Char('\n');
 }
 
 } // namespace
@@ -44,14 +47,16 @@ std::optional<QString> ProgramTexts::textFor(const QString& word) const
 
 QString ProgramTexts::help() const
 {
-    QString text = QStringLiteral("titlectl %1.\n\nUsage: titlectl COMMAND [OPTIONS] OPERANDS\n\n").arg(SUMMARY);
+    QString text =
+        QStringLiteral("titlectl %1.\n\nUsage: titlectl COMMAND [OPTIONS] OPERANDS\n\n").arg(SUMMARY);
     int width = 0;
     for (const auto& command : m_table.commands())
         width = std::max(width, static_cast<int>(command->name().size()));
     for (const auto& command : m_table.commands())
         text += columns(command->name(), command->summary(), width);
-    return text + QStringLiteral("\ntitlectl COMMAND --help explains one of them; --man-page and --completion write the "
-                                 "manual page and\nthe completion of bash.\nExit codes: %1.\n")
+    return text + QStringLiteral(
+                      "\ntitlectl COMMAND --help explains one of them; --man-page and --completion write the "
+                      "manual page and\nthe completion of bash.\nExit codes: %1.\n")
                       .arg(EXIT_CODES);
 }
 
@@ -65,7 +70,8 @@ QString ProgramTexts::synopsisOf(const Command& command)
 
 QString ProgramTexts::helpFor(const Command& command)
 {
-    QString text = synopsisOf(command) + QStringLiteral("\n\n  ") + command.summary() + QStringLiteral("\n\n");
+    QString text =
+        synopsisOf(command) + QStringLiteral("\n\n  ") + command.summary() + QStringLiteral("\n\n");
     const QList<CommandOption> options = CommandTable::optionsOf(command);
     int width = 0;
     for (const CommandOption& option : options)
@@ -77,14 +83,16 @@ QString ProgramTexts::helpFor(const Command& command)
 
 QString ProgramTexts::manPage() const
 {
-    QString text = QStringLiteral(".TH TITLECTL 1\n.SH NAME\ntitlectl \\- %1\n.SH SYNOPSIS\n").arg(forMan(SUMMARY));
+    QString text =
+        QStringLiteral(".TH TITLECTL 1\n.SH NAME\ntitlectl \\- %1\n.SH SYNOPSIS\n").arg(forMan(SUMMARY));
     for (const auto& command : m_table.commands())
         text += forMan(synopsisOf(*command)) + QStringLiteral("\n.br\n");
     text += QStringLiteral(".SH COMMANDS\n");
     for (const auto& command : m_table.commands()) {
         text += QStringLiteral(".TP\n.B %1\n%2.\n").arg(forMan(command->name()), forMan(command->summary()));
         for (const CommandOption& option : CommandTable::optionsOf(*command))
-            text += QStringLiteral(".RS\n.TP\n.B %1\n%2\n.RE\n").arg(forMan(option.synopsis()), forMan(option.help));
+            text += QStringLiteral(".RS\n.TP\n.B %1\n%2\n.RE\n")
+                        .arg(forMan(option.synopsis()), forMan(option.help));
     }
     return text + QStringLiteral(".SH EXIT STATUS\n%1.\n").arg(forMan(EXIT_CODES));
 }

@@ -23,7 +23,8 @@ std::optional<int> RenderBatch::processesOf(const QString& jobs)
     return isNumber && number >= 1 && number <= MOST_PROCESSES ? std::optional<int>(number) : std::nullopt;
 }
 
-QStringList RenderBatch::run(const QList<RenderJob>& jobs, int processes, const std::function<void()>& oneDone)
+QStringList RenderBatch::run(const QList<RenderJob>& jobs, int processes,
+                             const std::function<void()>& oneDone)
 {
     QStringList errors(jobs.size());
     const auto isDone = [&](qsizetype job, const QString& error) {

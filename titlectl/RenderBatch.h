@@ -19,8 +19,8 @@ public:
     RenderBatch() = delete;
 
     static CommandOption jobsOption();
-    // Returns the number of processes for a value of the option, one for each processor if it is empty; nothing
-    // for a text that is not such a number.
+    // Returns the number of processes for a value of the option, one for each processor if it is empty;
+    // nothing for a text that is not such a number.
     static std::optional<int> processesOf(const QString& jobs);
 
     // Returns what went wrong with each title, or empty strings. Calls oneDone after each, in any order.

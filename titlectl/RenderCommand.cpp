@@ -80,12 +80,13 @@ int RenderCommand::run(const Arguments& arguments, Output& output)
         return refuse(QStringLiteral("--only expects 1920, 960 or 240"));
     const std::optional<int> processes = RenderBatch::processesOf(arguments.value(RenderBatch::JOBS));
     if (!processes)
-        return refuse(QStringLiteral("--jobs expects a number from 1 to %1").arg(RenderBatch::MOST_PROCESSES));
+        return refuse(
+            QStringLiteral("--jobs expects a number from 1 to %1").arg(RenderBatch::MOST_PROCESSES));
     const TitlePaths paths(arguments.operands());
     if (!paths.isValid())
         return refuse(paths.error());
-    const QString out = arguments.has(OUT) ? QDir::cleanPath(QFileInfo(arguments.value(OUT)).absoluteFilePath())
-                                           : QString();
+    const QString out =
+        arguments.has(OUT) ? QDir::cleanPath(QFileInfo(arguments.value(OUT)).absoluteFilePath()) : QString();
     const QList<RenderJob> jobs = jobsFor(paths.folders(), out, *pictures);
     FolderLocks locks;
     const auto kind = out.isEmpty() ? FolderLock::Kind::Exclusive : FolderLock::Kind::Shared;
@@ -96,8 +97,8 @@ int RenderCommand::run(const Arguments& arguments, Output& output)
         if (!QDir().mkpath(target))
             return refuse(QStringLiteral("cannot make the folder %1").arg(target));
     int done = 0;
-    const QStringList errors = RenderBatch::run(
-        jobs, *processes, [&] { output.progress(++done, static_cast<int>(jobs.size())); });
+    const QStringList errors =
+        RenderBatch::run(jobs, *processes, [&] { output.progress(++done, static_cast<int>(jobs.size())); });
     return report(jobs, errors, output);
 }
 
@@ -114,6 +115,7 @@ int RenderCommand::report(const QList<RenderJob>& jobs, const QStringList& error
         output.message(QStringLiteral("%1: %2").arg(title, errors.at(i)));
     }
     output.line(QStringLiteral("%1 of %2 titles rendered").arg(jobs.size() - failed).arg(jobs.size()));
-    output.json(QJsonDocument(QJsonObject{{QStringLiteral("titles"), titles}, {QStringLiteral("failed"), failed}}));
+    output.json(
+        QJsonDocument(QJsonObject{{QStringLiteral("titles"), titles}, {QStringLiteral("failed"), failed}}));
     return failed > 0 ? Findings : Success;
 }

@@ -12,8 +12,8 @@ struct RenderJob {
     QString folder; // where the pictures go; empty: beside the title
     PictureFiles::Pictures pictures = PictureFiles::Pictures(PictureFiles::ALL);
 
-    // Convert to and from one line of text, as it is passed to a worker. Returns nothing for a line that is not
-    // a job.
+    // Convert to and from one line of text, as it is passed to a worker. Returns nothing for a line that is
+    // not a job.
     QByteArray toLine() const;
     static std::optional<RenderJob> fromLine(const QByteArray& line);
 };

@@ -42,12 +42,16 @@ void RenderWorkers::start(Worker& worker)
     }
     worker.process = std::make_unique<QProcess>();
     worker.process->setProcessChannelMode(QProcess::ForwardedErrorChannel);
-    connect(worker.process.get(), &QProcess::readyReadStandardOutput, this, [this, &worker] { readAnswers(worker); });
+    connect(worker.process.get(), &QProcess::readyReadStandardOutput, this,
+            [this, &worker] { readAnswers(worker); });
     connect(worker.process.get(), &QProcess::finished, this, [this, &worker] { workerEnded(worker); });
-    connect(worker.process.get(), &QProcess::errorOccurred, this, [this, &worker](QProcess::ProcessError error) {
-        if (error == QProcess::FailedToStart) // no other error comes without finished()
-            workerEnded(worker);
-    }, Qt::QueuedConnection);
+    connect(
+        worker.process.get(), &QProcess::errorOccurred, this,
+        [this, &worker](QProcess::ProcessError error) {
+            if (error == QProcess::FailedToStart) // no other error comes without finished()
+                workerEnded(worker);
+        },
+        Qt::QueuedConnection);
     worker.process->start(m_program, {RenderWorker::COMMAND});
     giveNext(worker);
 }

@@ -61,7 +61,9 @@ std::optional<SetCommand::Changes> SetCommand::parse(const QStringList& words, Q
         else if (text.trimmed().isEmpty())
             error = QStringLiteral("text %1 would be blank; such a text is deleted in the titler").arg(id);
         else if (isTooLong(text))
-            error = QStringLiteral("text %1 has more than %2 characters").arg(id).arg(TextObjectConstants::CHARACTER_LIMIT);
+            error = QStringLiteral("text %1 has more than %2 characters")
+                        .arg(id)
+                        .arg(TextObjectConstants::CHARACTER_LIMIT);
         else
             changes.insert(id, text);
         if (!error.isEmpty())

@@ -21,8 +21,8 @@ public:
     QList<CommandOption> options() const override { return {forceOption()}; }
     int run(const Arguments& arguments, Output& output) override;
 
-    // Reads words like "1=First line\nsecond line"; "\\" stands for a backslash. Returns nothing, with a reason in
-    // error, if one is not of this form, or its text is blank or too long.
+    // Reads words like "1=First line\nsecond line"; "\\" stands for a backslash. Returns nothing, with a
+    // reason in error, if one is not of this form, or its text is blank or too long.
     static std::optional<Changes> parse(const QStringList& words, QString& error);
 
 private:

@@ -3,8 +3,8 @@
 #include <QRectF>
 #include <QSizeF>
 
-// Where the titles of a contact sheet stand: pages of rows and columns, each cell a picture of 16:9 with a name
-// below it. Pure arithmetic; lengths are pixels of the page.
+// Where the titles of a contact sheet stand: pages of rows and columns, each cell a picture of 16:9 with a
+// name below it. Pure arithmetic; lengths are pixels of the page.
 class SheetLayout
 {
 public:

@@ -119,7 +119,9 @@ private:
     {
         const int number = value.toInt(0);
         if (number < 1 || number > highest)
-            fail(QStringLiteral("\"%1\" of field \"%2\" is not a number from 1 to %3").arg(what, id).arg(highest));
+            fail(QStringLiteral("\"%1\" of field \"%2\" is not a number from 1 to %3")
+                     .arg(what, id)
+                     .arg(highest));
         return number;
     }
 

@@ -14,12 +14,13 @@ public:
     static double inkWidth(const TText& text);
 
     // Returns whether the ink is within the width. If it is not, makes all sizes smaller in the same
-    // proportion, as little as necessary, but none below the smallest; when not even these sizes fit, the text
-    // has them and the result is false. A text that fits, or that has the smallest size already, is not changed.
+    // proportion, as little as necessary, but none below the smallest; when not even these sizes fit, the
+    // text has them and the result is false. A text that fits, or that has the smallest size already, is not
+    // changed.
     static bool shrink(TText& text, const TemplateFields::Fit& fit);
 
-    // Moves a text that is centred or aligned right, so that its centre or right edge is where it was with the
-    // text before.
+    // Moves a text that is centred or aligned right, so that its centre or right edge is where it was with
+    // the text before.
     static void keepAlignment(TText& text, const TText& before);
 
 private:

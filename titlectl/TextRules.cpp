@@ -114,7 +114,8 @@ void checkReadable(const CheckedTitle& title, FindingList& findings)
 void checkEmpty(const CheckedTitle& title, FindingList& findings)
 {
     if (title.isReadable() && title.archive().text().empty() && title.archive().getBgResourceBig().empty())
-        findings.append({title.path(), {}, {}, QStringLiteral("the title has neither texts nor a background")});
+        findings.append(
+            {title.path(), {}, {}, QStringLiteral("the title has neither texts nor a background")});
     checkSight(title, {Sight::Blank}, findings);
 }
 
@@ -148,8 +149,11 @@ void checkFonts(const CheckedTitle& title, FindingList& findings)
                 CharacterFormat::familyIsInstalled(family))
                 continue;
             reported.insert(family);
-            findings.append({title.path(), nameOf(*text), {},
-                             QStringLiteral("the font \"%1\" is not installed; another one is drawn").arg(family)});
+            findings.append(
+                {title.path(),
+                 nameOf(*text),
+                 {},
+                 QStringLiteral("the font \"%1\" is not installed; another one is drawn").arg(family)});
         }
     }
 }
@@ -170,7 +174,8 @@ bool lacksGlyph(const QString& character, const QFont& font)
     layout.createLine();
     layout.endLayout();
     const QList<QGlyphRun> runs = layout.glyphRuns();
-    return std::any_of(runs.begin(), runs.end(), [](const QGlyphRun& run) { return run.glyphIndexes().contains(0); });
+    return std::any_of(runs.begin(), runs.end(),
+                       [](const QGlyphRun& run) { return run.glyphIndexes().contains(0); });
 }
 
 void checkGlyphs(const CheckedTitle& title, FindingList& findings)
@@ -185,11 +190,16 @@ void checkGlyphs(const CheckedTitle& title, FindingList& findings)
                 continue;
             tried.insert(key);
             if (lacksGlyph(character, CharacterFormat::font(*style, 1.0)))
-                missing.append(QStringLiteral("U+%1").arg(character.toUcs4().constFirst(), 4, 16, QLatin1Char('0')).toUpper());
+                missing.append(QStringLiteral("U+%1")
+                                   .arg(character.toUcs4().constFirst(), 4, 16, QLatin1Char('0'))
+                                   .toUpper());
         }
         if (!missing.isEmpty())
-            findings.append({title.path(), nameOf(*text), {},
-                             QStringLiteral("no font has a glyph for %1").arg(missing.join(QStringLiteral(", ")))});
+            findings.append(
+                {title.path(),
+                 nameOf(*text),
+                 {},
+                 QStringLiteral("no font has a glyph for %1").arg(missing.join(QStringLiteral(", ")))});
     }
 }
 
@@ -197,17 +207,22 @@ void checkGlyphs(const CheckedTitle& title, FindingList& findings)
 
 QList<CheckRule> TextRules::table()
 {
-    return {
-        {QStringLiteral("title-unreadable"), QStringLiteral("a title file cannot be read"), nullptr, checkReadable},
-        {QStringLiteral("font-missing"), QStringLiteral("a font of a text is not installed"), nullptr, checkFonts},
-        {QStringLiteral("glyph-missing"), QStringLiteral("no font has a glyph for a character"), nullptr, checkGlyphs},
-        {QStringLiteral("text-empty"), QStringLiteral("a text has only blanks, or a title shows nothing"), nullptr,
-         checkEmpty},
-        {QStringLiteral("text-invisible"),
-         QStringLiteral("a text has size 0, draws nothing, or has the colour of its ground"), nullptr, checkInvisible},
-        {QStringLiteral("text-outside"), QStringLiteral("a text is outside the picture"), nullptr, checkOutside},
-        {QStringLiteral("text-cut-off"), QStringLiteral("a text is cut off at the edge of the picture"), nullptr,
-         checkCutOff},
-        {QStringLiteral("text-outside-safe-area"),
-         QStringLiteral("a text reaches out of the safe area, 90% of the picture"), nullptr, checkSafeArea}};
+    return {{QStringLiteral("title-unreadable"), QStringLiteral("a title file cannot be read"), nullptr,
+             checkReadable},
+            {QStringLiteral("font-missing"), QStringLiteral("a font of a text is not installed"), nullptr,
+             checkFonts},
+            {QStringLiteral("glyph-missing"), QStringLiteral("no font has a glyph for a character"), nullptr,
+             checkGlyphs},
+            {QStringLiteral("text-empty"), QStringLiteral("a text has only blanks, or a title shows nothing"),
+             nullptr, checkEmpty},
+            {QStringLiteral("text-invisible"),
+             QStringLiteral("a text has size 0, draws nothing, or has the colour of its ground"), nullptr,
+             checkInvisible},
+            {QStringLiteral("text-outside"), QStringLiteral("a text is outside the picture"), nullptr,
+             checkOutside},
+            {QStringLiteral("text-cut-off"), QStringLiteral("a text is cut off at the edge of the picture"),
+             nullptr, checkCutOff},
+            {QStringLiteral("text-outside-safe-area"),
+             QStringLiteral("a text reaches out of the safe area, 90% of the picture"), nullptr,
+             checkSafeArea}};
 }

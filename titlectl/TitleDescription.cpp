@@ -69,7 +69,8 @@ QJsonArray runsOf(const TText& text)
 
 QString alignOf(const TText& text)
 {
-    static const QString NAMES[] = {QStringLiteral("left"), QStringLiteral("centre"), QStringLiteral("right")};
+    static const QString NAMES[] = {QStringLiteral("left"), QStringLiteral("centre"),
+                                    QStringLiteral("right")};
     return NAMES[std::clamp(text.getTextAlign() + 1, 0, 2)];
 }
 

@@ -13,8 +13,8 @@ public:
     // Keeps a reference to the record.
     explicit TitleDescription(const Archive& archive) : m_archive(archive) {}
 
-    // Places are canvas pixels (1280x720), sizes and outline widths pixels of the 1920 raster. Characters of the
-    // same style make one run.
+    // Places are canvas pixels (1280x720), sizes and outline widths pixels of the 1920 raster. Characters of
+    // the same style make one run.
     QJsonObject json() const;
     QStringList lines() const;
 

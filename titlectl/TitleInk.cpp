@@ -80,7 +80,8 @@ QImage TitleInk::draw(const QRect& area)
     image.fill(Qt::transparent);
     QPainter painter(&image);
     painter.setRenderHint(QPainter::Antialiasing);
-    m_raster.scene().render(&painter, QRectF(QPointF(0, 0), QSizeF(area.size())), area, Qt::IgnoreAspectRatio);
+    m_raster.scene().render(&painter, QRectF(QPointF(0, 0), QSizeF(area.size())), area,
+                            Qt::IgnoreAspectRatio);
     return image;
 }
 

@@ -8,8 +8,8 @@
 
 class Archive;
 
-// What the texts of a title draw, in pixels of the 1920x1080 raster: where, and whether it stands out from what
-// is around it. GUI thread only.
+// What the texts of a title draw, in pixels of the 1920x1080 raster: where, and whether it stands out from
+// what is around it. GUI thread only.
 class TitleInk
 {
 public:

@@ -35,7 +35,8 @@ void TitlePaths::add(const QString& path)
     } else if (info.isDir()) {
         std::vector<std::string> children = TitleParserUtility::queryChildFolders(path.toStdString());
         std::sort(children.begin(), children.end());
-        std::erase_if(children, [](const std::string& child) { return !hasTitles(QString::fromStdString(child)); });
+        std::erase_if(children,
+                      [](const std::string& child) { return !hasTitles(QString::fromStdString(child)); });
         for (const std::string& child : children)
             addFolder(QString::fromStdString(child));
         if (children.empty())
@@ -64,8 +65,8 @@ void TitlePaths::addFolder(const QString& path)
 
 TitlePaths::Folder& TitlePaths::folder(const QString& path)
 {
-    const auto found =
-        std::find_if(m_folders.begin(), m_folders.end(), [&](const Folder& known) { return known.path == path; });
+    const auto found = std::find_if(m_folders.begin(), m_folders.end(),
+                                    [&](const Folder& known) { return known.path == path; });
     if (found != m_folders.end())
         return *found;
     m_folders.append({path, {}, false});

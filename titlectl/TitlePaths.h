@@ -9,14 +9,14 @@ class TitlePaths
 {
 public:
     struct Folder {
-        QString path;       // absolute, without a final "/"
-        QStringList titles; // full paths, those of a whole folder in its order
+        QString path;         // absolute, without a final "/"
+        QStringList titles;   // full paths, those of a whole folder in its order
         bool isWhole = false; // whether the folder itself was named, not single titles in it
     };
 
-    // Resolves the paths: a title file, a folder of titles, or a folder of such folders. A folder that is named
-    // in several ways appears once. If a path does not exist or is neither, isValid() is false and error() says
-    // which.
+    // Resolves the paths: a title file, a folder of titles, or a folder of such folders. A folder that is
+    // named in several ways appears once. If a path does not exist or is neither, isValid() is false and
+    // error() says which.
     explicit TitlePaths(const QStringList& paths);
 
     bool isValid() const { return m_error.isEmpty(); }

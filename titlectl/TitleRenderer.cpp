@@ -36,12 +36,14 @@ QString TitleRenderer::render(const RenderJob& job)
     return write(archive, images, job.pictures);
 }
 
-QString TitleRenderer::write(const Archive& archive, const QList<QImage>& images, PictureFiles::Pictures pictures)
+QString TitleRenderer::write(const Archive& archive, const QList<QImage>& images,
+                             PictureFiles::Pictures pictures)
 {
     if (PictureFiles::write(archive, images.at(0), images.at(1), pictures))
         return {};
     const QString refusal = takeRefusal();
-    return refusal.isEmpty() ? QStringLiteral("a picture has no valid name, or the checker picture of the data path is "
-                                              "missing")
-                             : refusal;
+    return refusal.isEmpty()
+               ? QStringLiteral("a picture has no valid name, or the checker picture of the data path is "
+                                "missing")
+               : refusal;
 }

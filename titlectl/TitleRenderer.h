@@ -17,7 +17,8 @@ public:
     // Draws the pictures of the record, and writes them with write().
     QList<QImage> draw(const Archive& archive) { return m_render.drawPictures(archive); }
     // Writes pictures that draw() returned. Returns what went wrong, or an empty string.
-    static QString write(const Archive& archive, const QList<QImage>& images, PictureFiles::Pictures pictures);
+    static QString write(const Archive& archive, const QList<QImage>& images,
+                         PictureFiles::Pictures pictures);
 
 private:
     ThumbnailRender m_render;

@@ -17,9 +17,9 @@ public:
     QString path() const { return m_stage.path(); }
 
     // Moves the files of a title into the folder: "STEM.xml", and all that begin with "STEM_". The title file
-    // comes after its background and before its pictures, so that a process that is killed meanwhile leaves at
-    // most pictures that are older than their title, which are made again. Returns what went wrong, or an empty
-    // string; files that are not in the folder by then are dropped.
+    // comes after its background and before its pictures, so that a process that is killed meanwhile leaves
+    // at most pictures that are older than their title, which are made again. Returns what went wrong, or an
+    // empty string; files that are not in the folder by then are dropped.
     QString place(const QString& stem) const;
     // Drops the files of a title.
     void drop(const QString& stem) const;

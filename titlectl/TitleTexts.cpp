@@ -75,8 +75,9 @@ void TitleTexts::replace(TText& text, const QString& characters)
     const auto firstKept = styles.end() - end;
     TextStyle style;
     if (!styles.empty())
-        style = begin < static_cast<qsizetype>(styles.size()) - end ? **firstReplaced
-                                                                    : *styles[static_cast<std::size_t>(std::max<qsizetype>(begin - 1, 0))];
+        style = begin < static_cast<qsizetype>(styles.size()) - end
+                    ? **firstReplaced
+                    : *styles[static_cast<std::size_t>(std::max<qsizetype>(begin - 1, 0))];
     std::vector<TextStyle*> result(styles.begin(), firstReplaced);
     for (qsizetype i = begin; i < characters.size() - end; ++i) {
         auto added = std::make_unique<TextStyle>(style);

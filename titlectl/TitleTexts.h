@@ -19,6 +19,7 @@ public:
 
     // Replaces the characters. What is equal at the beginning and at the end keeps its styles; the characters
     // between take the style of the first one that they replace, or of the one before. A text that is centred
-    // or set right keeps its centre or right edge. A text without runs takes the default style. GUI thread only.
+    // or set right keeps its centre or right edge. A text without runs takes the default style. GUI thread
+    // only.
     static void replace(TText& text, const QString& characters);
 };

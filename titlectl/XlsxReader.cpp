@@ -231,7 +231,8 @@ private:
     {
         Links links;
         const QString folder = partName.left(partName.lastIndexOf(QLatin1Char('/')) + 1);
-        Part part(m_path, folder + QLatin1String("_rels/") + partName.mid(folder.size()) + QLatin1String(".rels"));
+        Part part(m_path,
+                  folder + QLatin1String("_rels/") + partName.mid(folder.size()) + QLatin1String(".rels"));
         while (part.next() && links.size() < MOST_LINKS) {
             if (!part.begins(QLatin1String("Relationship")))
                 continue;
@@ -276,14 +277,13 @@ private:
             return;
         Part part(m_path, name);
         RichText text;
-        while (part.next()) {
+        while (part.next())
             if (part.begins(QLatin1String("si")))
                 text.begin();
             else if (part.ends(QLatin1String("si")))
                 m_strings.add(text.text());
             else if (!text.take(part))
                 return failForCell();
-        }
         finish(part);
     }
 
@@ -355,7 +355,8 @@ private:
             return shared.value_or(QString());
         }
         if (cell.type == QLatin1String("b"))
-            return cell.value.trimmed() == QLatin1String("1") ? QStringLiteral("TRUE") : QStringLiteral("FALSE");
+            return cell.value.trimmed() == QLatin1String("1") ? QStringLiteral("TRUE")
+                                                              : QStringLiteral("FALSE");
         if (cell.type == QLatin1String("e")) {
             fault = QStringLiteral("column %1 has the error %2").arg(cell.column + 1).arg(cell.value);
             return {};
@@ -391,7 +392,8 @@ private:
         if (row.cells.isEmpty() && row.fault.isEmpty())
             return;
         if (isHeader && !row.fault.isEmpty())
-            m_table.fail(QStringLiteral("row %1: The header cannot be used: %2").arg(row.number).arg(row.fault));
+            m_table.fail(
+                QStringLiteral("row %1: The header cannot be used: %2").arg(row.number).arg(row.fault));
         else if (isHeader)
             m_table.setHeader(row.cells);
         else if (!row.fault.isEmpty())

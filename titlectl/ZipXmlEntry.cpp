@@ -59,7 +59,8 @@ bool ZipXmlEntry::openEntry(const QByteArray& name)
     else if (entry.compression_method != STORED && entry.compression_method != Z_DEFLATED)
         fail(QStringLiteral("It is packed in an unknown way"));
     else if (entry.uncompressed_size > ZPOS64_T(ENTRY_LIMIT))
-        fail(QStringLiteral("%1 in it is longer than %2 bytes").arg(QString::fromUtf8(name)).arg(ENTRY_LIMIT));
+        fail(
+            QStringLiteral("%1 in it is longer than %2 bytes").arg(QString::fromUtf8(name)).arg(ENTRY_LIMIT));
     else if (unzOpenCurrentFile(m_zip) != UNZ_OK)
         fail(QStringLiteral("It is damaged"));
     else
@@ -97,8 +98,8 @@ qint64 ZipXmlEntry::writeData(const char*, qint64)
 }
 
 // Refuses tags with very many attributes, which the XML reader compares with each other; very long texts;
-// comments, document types and entities, which no workbook has; and encodings in which the signs of XML are not
-// single bytes.
+// comments, document types and entities, which no workbook has; and encodings in which the signs of XML are
+// not single bytes.
 bool ZipXmlEntry::accepts(char byte)
 {
     const Place before = m_place;

@@ -3,6 +3,9 @@
 #include "tests/support/Patience.h"
 
 #include <QAbstractEventDispatcher>
+#include <QPaintEvent>
+#include <QRegion>
+#include <QScreen>
 #include <QTimerEvent>
 #include <functional>
 
@@ -17,10 +20,14 @@ class PaintCounter : public QObject
 public:
     bool eventFilter(QObject*, QEvent* event) override
     {
-        paints += event->type() == QEvent::Paint;
+        if (event->type() == QEvent::Paint) {
+            ++paints;
+            region += static_cast<QPaintEvent*>(event)->region();
+        }
         return false;
     }
     int paints = 0;
+    QRegion region; // of all paints
 };
 
 // Time passes: every timer below the object fires. Returns how many did.
@@ -56,8 +63,14 @@ private Q_SLOTS:
     void movedShadow_data();
     void movedShadow();
     void keptPictureFollowsTheText();
+    void keysPaintWhatChanges_data();
+    void keysPaintWhatChanges();
+    void aKeyPaintsItsParagraph();
 
 private:
+    // Returns what is on the screen, without painting anything.
+    QImage onScreen() const { return m_canvas->view.screen()->grabWindow(m_canvas->view.winId()).toImage(); }
+    void openLines(const QStringList& lines, int align, bool outlined);
     void bring(const QString& state);
     // Paints everything that is due.
     void settle();
@@ -257,6 +270,74 @@ void tst_canvasscene_repaint::keptPictureFollowsTheText()
     QVERIFY(grab() != edited);
     m_canvas->scene->clearItemsSelectionAndFocus();
     QCOMPARE(grab(), last);
+}
+
+void tst_canvasscene_repaint::openLines(const QStringList& lines, int align, bool outlined)
+{
+    TText record = makeRecord(lines.join(QLatin1Char('\n')), 1, "KST", 60);
+    record.setTextAlign(align);
+    TEdge edge;
+    edge.setEdgeWidth(12);
+    edge.setEdgeColor("#00AAFF");
+    for (TextStyle* style : record.textItems()) {
+        style->setIsTextEdge(outlined ? 1 : 0);
+        style->setTextEdge(edge);
+    }
+    m_canvas->open({record});
+}
+
+void tst_canvasscene_repaint::keysPaintWhatChanges_data()
+{
+    QTest::addColumn<int>("align");
+    QTest::addColumn<bool>("outlined");
+    for (const int align : {0, 1, 2}) {
+        QTest::addRow("align %d", align) << align << false;
+        QTest::addRow("align %d, outlined", align) << align << true;
+    }
+}
+
+// After each key the screen shows what it shows when everything is painted anew.
+void tst_canvasscene_repaint::keysPaintWhatChanges()
+{
+    QFETCH(int, align);
+    QFETCH(bool, outlined);
+    openLines({QStringLiteral("top"), QStringLiteral("the longest line"), QStringLiteral("a j")}, align,
+              outlined);
+    GraphicsText* text = m_canvas->text(1);
+    text->initNewTextSelectAll();
+    QTRY_VERIFY(text->hasFocus());
+    const auto keys = {Qt::Key_End,    Qt::Key_A,    Qt::Key_Q,  Qt::Key_Left,      Qt::Key_W,
+                       Qt::Key_Up,     Qt::Key_X,    Qt::Key_Up, Qt::Key_Backspace, Qt::Key_Return,
+                       Qt::Key_Y,      Qt::Key_Down, Qt::Key_J,  Qt::Key_Home,      Qt::Key_Backspace,
+                       Qt::Key_Delete, Qt::Key_End,  Qt::Key_G,  Qt::Key_Space,     Qt::Key_F};
+    int number = 0;
+    for (const Qt::Key key : keys) {
+        QTest::keyClick(m_canvas->view.viewport(), key);
+        settle();
+        const QImage shown = onScreen();
+        m_canvas->view.viewport()->update();
+        settle();
+        QVERIFY2(shown == onScreen(), qPrintable(QString("key %1: %2").arg(number).arg(key)));
+        ++number;
+    }
+}
+
+void tst_canvasscene_repaint::aKeyPaintsItsParagraph()
+{
+    openLines({QStringLiteral("the longest line"), QStringLiteral("a"), QStringLiteral("b"),
+               QStringLiteral("c"), QStringLiteral("d"), QStringLiteral("e"), QStringLiteral("f")},
+              2, false);
+    GraphicsText* text = m_canvas->text(1);
+    text->initNewTextSelectAll();
+    QTRY_VERIFY(text->hasFocus());
+    QTest::keyClick(m_canvas->view.viewport(), Qt::Key_End);
+    QTest::keyClick(m_canvas->view.viewport(), Qt::Key_E); // the first one also sets the font of the caret
+    settle();
+    m_counter.region = QRegion();
+    QCOMPARE(paintsOf([&] { QTest::keyClick(m_canvas->view.viewport(), Qt::Key_E); }), 1);
+    const int painted = m_counter.region.boundingRect().height();
+    const double whole = text->layoutRect().height();
+    QVERIFY2(painted > 0 && painted < whole / 2, qPrintable(QString("%1 of %2").arg(painted).arg(whole)));
 }
 
 QTEST_MAIN(tst_canvasscene_repaint)

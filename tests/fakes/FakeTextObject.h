@@ -36,6 +36,8 @@ public:
     void layoutChanged() override {}
     void parentFollows() override {}
     void repaint() override {}
+    void repaintBlock(int) override {}
+    void blockChanged(int) override {}
     void showShadow(const TShadow&) override {}
 
     void contentsEdited(TText&, TText&, TText&, TText&) override { reports.append("edited"); }

@@ -6,8 +6,8 @@
 #include "library/ArchiveItem.h"
 #include "library/ArchiveList.h"
 #include "library/ArchiveMenu.h"
+#include "library/CheckeredPicture.h"
 
-#include <QGraphicsView>
 #include <QLabel>
 #include <QScopeGuard>
 #include <QScrollBar>
@@ -554,8 +554,8 @@ void tst_archivelist::itemStyles()
     ArchiveItem shown(&archive, ArchiveItem::LIST_ITEM);
     QCOMPARE(shown.size(), QSize(505, 139));
     shown.initArchiveItemChildWidget();
-    const auto* view = shown.findChild<QGraphicsView*>();
-    QCOMPARE(view->geometry(), QRect(3, 2, 240, 135));
+    const auto* picture = shown.findChild<CheckeredPicture*>();
+    QCOMPARE(picture->geometry(), QRect(3, 2, 240, 135));
     shown.setStyleSheet(ArchiveItem::OPERATE_AND_UN_SELECT_STATE);
     QCOMPARE(shown.grab().toImage().pixelColor(250, 0), QColor(0, 186, 230));
     shown.setStyleSheet(ArchiveItem::UN_OPERATE_AND_SELECT_STATE);
@@ -566,7 +566,7 @@ void tst_archivelist::itemStyles()
     ArchiveItem narrow(&archive, ArchiveItem::NARROW_ITEM);
     QCOMPARE(narrow.size(), QSize(254, 139));
     narrow.initArchiveItemChildWidget();
-    QVERIFY(!narrow.findChild<QGraphicsView*>());
+    QVERIFY(!narrow.findChild<CheckeredPicture*>());
 }
 
 void tst_archivelist::itemText_data()

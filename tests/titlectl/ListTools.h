@@ -6,7 +6,8 @@
 #include <QString>
 #include <QStringList>
 
-// Returns the rows as "line: cell|cell", rows that cannot be used as "line! reason", or the error of the list.
+// Returns the rows as "line: cell|cell", rows that cannot be used as "line! reason", or the error of the
+// list.
 inline QStringList rowsOf(const ListTable& table)
 {
     if (table.hasFailed())

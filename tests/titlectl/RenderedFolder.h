@@ -9,8 +9,8 @@
 #include <QString>
 #include <QStringList>
 
-// Makes a folder of titles that nothing is wrong with: each has its stem as text, its pictures, and a row of the
-// order.
+// Makes a folder of titles that nothing is wrong with: each has its stem as text, its pictures, and a row of
+// the order.
 inline QString renderedFolder(LibraryFixture& fixture, const QString& name, const QStringList& stems)
 {
     const QString folder = fixture.makeFolder(name);

@@ -8,8 +8,8 @@
 #include <QStringList>
 #include <vector>
 
-// Returns a text object with one run for each part, whose size is 40 for the first part, 50 for the second and
-// so on.
+// Returns a text object with one run for each part, whose size is 40 for the first part, 50 for the second
+// and so on.
 inline TText textOf(const QStringList& parts, int id = 1)
 {
     TText text;

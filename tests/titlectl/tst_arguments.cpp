@@ -33,7 +33,8 @@ void tst_arguments::accepted_data()
     QTest::newRow("last value") << Words{"--out", "x", "--out=y"} << Words{} << "y" << false;
     QTest::newRow("value like an option") << Words{"--out", "--force"} << Words{} << "--force" << false;
     QTest::newRow("switch behind") << Words{"a", "--force"} << Words{"a"} << "" << true;
-    QTest::newRow("behind two dashes") << Words{"--force", "--", "--out", "-"} << Words{"--out", "-"} << "" << true;
+    QTest::newRow("behind two dashes")
+        << Words{"--force", "--", "--out", "-"} << Words{"--out", "-"} << "" << true;
     QTest::newRow("one dash") << Words{"-"} << Words{"-"} << "" << false;
     QTest::newRow("text with an equals sign") << Words{"1=--x"} << Words{"1=--x"} << "" << false;
 }

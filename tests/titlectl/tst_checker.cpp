@@ -98,38 +98,43 @@ void tst_checker::eachFaultAlone_data()
     QTest::addColumn<QString>("file");
     QTest::addColumn<QString>("object");
     const auto row = [](const char* rule, const char* file, const char* object, const Damage& damage) {
-        QTest::addRow("%s %s %s", rule, file, object) << damage << QString(rule) << QString(file) << QString(object);
+        QTest::addRow("%s %s %s", rule, file, object)
+            << damage << QString(rule) << QString(file) << QString(object);
     };
     row("order-unreadable", ".order.xml", "", [](const QString& folder) {
         QFile::resize(folder + "/.order.xml", QFileInfo(folder + "/.order.xml").size() / 2);
     });
-    row("order-names-missing", ".order.xml", "gone.xml",
-        [](const QString& folder) { LibraryFixture::writeOrder(folder, {"a", "gone", "b", "c"}); });
-    row("order-names-missing", ".order.xml", "a.xml",
-        [](const QString& folder) { LibraryFixture::writeOrder(folder, {"a", "b", "c", "a"}); });
-    row("order-omits", "b.xml", "", [](const QString& folder) { LibraryFixture::writeOrder(folder, {"a", "c"}); });
+    row("order-names-missing", ".order.xml", "gone.xml", [](const QString& folder) {
+        LibraryFixture::writeOrder(folder, {"a", "gone", "b", "c"});
+    });
+    row("order-names-missing", ".order.xml", "a.xml", [](const QString& folder) {
+        LibraryFixture::writeOrder(folder, {"a", "b", "c", "a"});
+    });
+    row("order-omits", "b.xml", "", [](const QString& folder) {
+        LibraryFixture::writeOrder(folder, {"a", "c"});
+    });
     row("order-omits", "", "", [](const QString& folder) { QFile::remove(folder + "/.order.xml"); });
     row("leftover", "old_1920.png", "",
         [](const QString& folder) { QFile::copy(folder + "/a_1920.png", folder + "/old_1920.png"); });
-    row("title-unreadable", "b.xml", "", [](const QString& folder) { write(folder + "/b.xml", "<manifest"); });
+    row("title-unreadable", "b.xml", "",
+        [](const QString& folder) { write(folder + "/b.xml", "<manifest"); });
     row("font-missing", "b.xml", "text 1", [](const QString& folder) {
         editStyles(folder, [](TextStyle& style) { style.setFontFamily("No Such Font"); });
     });
     row("glyph-missing", "b.xml", "text 1", [](const QString& folder) {
-        editStyles(folder, [](TextStyle& style) { style.setText("\xF3\xB0\x80\x80"); }); // a private character
+        editStyles(folder,
+                   [](TextStyle& style) { style.setText("\xF3\xB0\x80\x80"); }); // a private character
     });
     row("text-empty", "b.xml", "text 1",
         [](const QString& folder) { editStyles(folder, [](TextStyle& style) { style.setText(" "); }); });
-    row("text-empty", "b.xml", "", [](const QString& folder) {
-        edit(folder, [](Archive& archive) { archive.releaseVectorText(); });
-    });
+    row("text-empty", "b.xml", "",
+        [](const QString& folder) { edit(folder, [](Archive& archive) { archive.releaseVectorText(); }); });
     row("text-invisible", "b.xml", "text 1",
         [](const QString& folder) { editStyles(folder, [](TextStyle& style) { style.setFontSize(0); }); });
     row("text-outside", "b.xml", "text 1",
         [](const QString& folder) { editText(folder, [](TText& text) { text.setXValue(4000); }); });
-    row("text-cut-off", "b.xml", "text 1", [](const QString& folder) {
-        editText(folder, [](TText& text) { text.setYValue(-60); });
-    });
+    row("text-cut-off", "b.xml", "text 1",
+        [](const QString& folder) { editText(folder, [](TText& text) { text.setYValue(-60); }); });
     row("text-outside-safe-area", "b.xml", "text 1",
         [](const QString& folder) { editText(folder, [](TText& text) { text.setXValue(-20); }); });
     row("picture-missing", "b.xml", "picture 960",

@@ -1,4 +1,5 @@
-// The commands and what the program says about them; how a wrong command line and a folder in use are refused.
+// The commands and what the program says about them; how a wrong command line and a folder in use are
+// refused.
 #include "RenderedFolder.h"
 #include "support/FolderLock.h"
 #include "titlectl/Command.h"
@@ -84,8 +85,10 @@ void tst_commandtable::wrongUse_data()
     QTest::newRow("no operand") << QStringList{"render"} << QByteArray("render expects PATH...");
     QTest::newRow("too many operands") << QStringList{"show", "a", "b"} << QByteArray("show expects PATH");
     QTest::newRow("no path") << QStringList{"check"} << QByteArray("check expects PATH...");
-    QTest::newRow("missing path") << QStringList{"check", "/nowhere"} << QByteArray("/nowhere does not exist");
-    QTest::newRow("unknown rule") << QStringList{"check", "--without", "x,", "/tmp"} << QByteArray("no rule x");
+    QTest::newRow("missing path") << QStringList{"check", "/nowhere"}
+                                  << QByteArray("/nowhere does not exist");
+    QTest::newRow("unknown rule") << QStringList{"check", "--without", "x,", "/tmp"}
+                                  << QByteArray("no rule x");
     QTest::newRow("jobs") << QStringList{"render", "--jobs", "0", "/tmp"} << QByteArray("from 1 to");
     QTest::newRow("only") << QStringList{"render", "--only", "7", "/tmp"} << QByteArray("1920, 960 or 240");
     QTest::newRow("kind of sheet") << QStringList{"sheet", "/tmp", "x.gif"} << QByteArray(".pdf nor in .png");

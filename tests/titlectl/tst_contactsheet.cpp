@@ -76,7 +76,8 @@ void tst_contactsheet::pdf()
 {
     const QString folder = renderedFolder(m_fixture, "sheet", {"one"});
     const QString out = m_fixture.makeFolder("out") + "/s.pdf";
-    QCOMPARE(ContactSheet("Heading", titles(folder, QStringList(17, "one"))).write(out, [](int) {}), QString());
+    QCOMPARE(ContactSheet("Heading", titles(folder, QStringList(17, "one"))).write(out, [](int) {}),
+             QString());
     QFile file(out);
     QVERIFY(file.open(QIODevice::ReadOnly));
     const QByteArray bytes = file.readAll();

@@ -74,7 +74,8 @@ private Q_SLOTS:
         QTest::newRow("line breaks in quotes")
             << "\"a\r\nb\nc\rd\",e\r\nf" << QStringList{"a\r\nb\nc\rd", "e"} << 14 << 4 << none;
         QTest::newRow("not closed") << "a,\"b\nc,d\n" << QStringList() << 5 << 1 << "a quote is not closed";
-        QTest::newRow("text behind") << "\"a\"b\nc" << QStringList() << 5 << 1 << "text follows a closing quote";
+        QTest::newRow("text behind") << "\"a\"b\nc" << QStringList() << 5 << 1
+                                     << "text follows a closing quote";
         QTest::newRow("quote inside") << "a\"b\"\r\nc" << QStringList() << 6 << 1
                                       << "a quote stands in a cell that does not begin with one";
     }
@@ -94,8 +95,9 @@ private Q_SLOTS:
     {
         const ListTable table = read(WHOLE);
         QCOMPARE(headerOf(table), QStringLiteral("Name|Role|Note"));
-        QCOMPARE(rowsOf(table), QStringList({QString::fromUtf8("2: Müller, \"Anna\"|Reporterin|first\nsecond"),
-                                             QString::fromUtf8("4: 金田|記者|"), QString::fromUtf8("6: Ève||x")}));
+        QCOMPARE(rowsOf(table),
+                 QStringList({QString::fromUtf8("2: Müller, \"Anna\"|Reporterin|first\nsecond"),
+                              QString::fromUtf8("4: 金田|記者|"), QString::fromUtf8("6: Ève||x")}));
     }
 
     void badRowsDoNotStopTheOthers()
@@ -108,10 +110,10 @@ private Q_SLOTS:
                                      "8,9,10\n"
                                      "\"11\"x,12\n"
                                      "13,14\n");
-        QCOMPARE(rowsOf(table),
-                 QStringList({"2: 1|2", "3! text follows a closing quote", "4: 5|6",
-                              "5! it has 1 columns, the header has 2", "6! it has 3 columns, the header has 2",
-                              "7! text follows a closing quote", "8: 13|14"}));
+        QCOMPARE(rowsOf(table), QStringList({"2: 1|2", "3! text follows a closing quote", "4: 5|6",
+                                             "5! it has 1 columns, the header has 2",
+                                             "6! it has 3 columns, the header has 2",
+                                             "7! text follows a closing quote", "8: 13|14"}));
     }
 
     void refused_data()
@@ -122,8 +124,10 @@ private Q_SLOTS:
         QTest::newRow("blank lines") << QByteArray("\n\r\n,,\n") << "The list is empty";
         QTest::newRow("mark only") << QByteArray("\xEF\xBB\xBF") << "The list is empty";
         QTest::newRow("header") << QByteArray("\"a\nb") << "line 1: The header cannot be used";
-        QTest::newRow("long cell") << QByteArray("a\n") + QByteArray(ListTable::CELL_LIMIT + 1, 'x') << "line 2: A cell";
-        QTest::newRow("long line") << QByteArray("a,b\n1,2\n3,\"") + QByteArray(3 * ListTable::ROW_BYTES_LIMIT, 'x')
+        QTest::newRow("long cell") << QByteArray("a\n") + QByteArray(ListTable::CELL_LIMIT + 1, 'x')
+                                   << "line 2: A cell";
+        QTest::newRow("long line") << QByteArray("a,b\n1,2\n3,\"") +
+                                          QByteArray(3 * ListTable::ROW_BYTES_LIMIT, 'x')
                                    << "line 3: A cell";
         QTest::newRow("many columns") << QByteArray(300, ',') << "line 1: A cell";
     }
@@ -141,15 +145,16 @@ private Q_SLOTS:
     {
         const QString text = QString::fromUtf8("\uFEFFName\tRole\r\nÈve 快讯\t😀\r\n");
         const QStringList expected = {QString::fromUtf8("2: Ève 快讯|😀")};
-        for (const auto encoding : {QStringConverter::Utf8, QStringConverter::Utf16LE, QStringConverter::Utf16BE}) {
+        for (const auto encoding :
+             {QStringConverter::Utf8, QStringConverter::Utf16LE, QStringConverter::Utf16BE}) {
             QStringEncoder encoder(encoding);
             const QByteArray bytes = encoder(text);
             const ListTable table = read(bytes);
             QCOMPARE(headerOf(table), QStringLiteral("Name|Role"));
             QCOMPARE(rowsOf(table), expected);
         }
-        QCOMPARE(rowsOf(read("a\nM\xFCller\nb\xC3")), QStringList({"2! column 1: its text is not UTF-8",
-                                                                 "3! column 1: its text is not UTF-8"}));
+        QCOMPARE(rowsOf(read("a\nM\xFCller\nb\xC3")),
+                 QStringList({"2! column 1: its text is not UTF-8", "3! column 1: its text is not UTF-8"}));
     }
 
     void longFile()

@@ -11,11 +11,12 @@
 namespace
 {
 
-const QByteArray WHOLE = "\xEF\xBB\xBF[\n"
-                         " {\"Name\": \"M\xC3\xBCller, \\\"Anna\\\"\", \"Role\": \"a\\nb\"},\r\n"
-                         " {\"role\": null, \"Number\": 12, \"Share\": 1.5, \"On\": true},\n"
-                         "\n"
-                         " {\"Name\": \"}]{[,\\\\\", \"Number\": 9007199254740993, \"Share\": 1e-7, \"On\": false}]\n";
+const QByteArray WHOLE =
+    "\xEF\xBB\xBF[\n"
+    " {\"Name\": \"M\xC3\xBCller, \\\"Anna\\\"\", \"Role\": \"a\\nb\"},\r\n"
+    " {\"role\": null, \"Number\": 12, \"Share\": 1.5, \"On\": true},\n"
+    "\n"
+    " {\"Name\": \"}]{[,\\\\\", \"Number\": 9007199254740993, \"Share\": 1e-7, \"On\": false}]\n";
 
 } // namespace
 
@@ -28,8 +29,9 @@ private Q_SLOTS:
     {
         const ListTable table = JsonListReader::read(WHOLE);
         QCOMPARE(headerOf(table), QStringLiteral("Name|Role|Number|On|Share"));
-        QCOMPARE(rowsOf(table), QStringList({QString::fromUtf8("2: Müller, \"Anna\"|a\nb|||"), "3: ||12|true|1.5",
-                                             "5: }]{[,\\||9007199254740993|false|0.0000001"}));
+        QCOMPARE(rowsOf(table),
+                 QStringList({QString::fromUtf8("2: Müller, \"Anna\"|a\nb|||"), "3: ||12|true|1.5",
+                              "5: }]{[,\\||9007199254740993|false|0.0000001"}));
     }
 
     void badRowsDoNotStopTheOthers()
@@ -71,17 +73,22 @@ private Q_SLOTS:
         QTest::newRow("nothing") << QByteArray() << "The list is not an array of objects";
         QTest::newRow("object") << QByteArray("{\"a\": 1}") << "The list is not an array of objects";
         QTest::newRow("empty") << QByteArray(" [ ] ") << "The list is empty";
-        QTest::newRow("no object") << QByteArray("[\n5, 6]") << "line 2: The row cannot be used, and no other can: it is";
+        QTest::newRow("no object") << QByteArray("[\n5, 6]")
+                                   << "line 2: The row cannot be used, and no other can: it is";
         QTest::newRow("no end") << QByteArray("[{\"a\": 1}") << "line 1: The row or the list has no end";
-        QTest::newRow("no end of a row") << QByteArray("[{\"a\": 1},\n{\"a\"") << "line 2: The row or the list has no end";
+        QTest::newRow("no end of a row")
+            << QByteArray("[{\"a\": 1},\n{\"a\"") << "line 2: The row or the list has no end";
         QTest::newRow("text behind") << QByteArray("[{\"a\": 1}]\nx") << "line 2: Text follows the list";
-        QTest::newRow("long row") << QByteArray("[\n{\"a\": \"") + QByteArray(ListTable::ROW_BYTES_LIMIT, 'x') + "\"}]"
+        QTest::newRow("long row") << QByteArray("[\n{\"a\": \"") +
+                                         QByteArray(ListTable::ROW_BYTES_LIMIT, 'x') + "\"}]"
                                   << "line 2: The row is longer than 1048576 bytes";
-        QTest::newRow("deep") << QByteArray("[") + QByteArray(100000, '[') << "line 1: The row or the list has no end";
+        QTest::newRow("deep") << QByteArray("[") + QByteArray(100000, '[')
+                              << "line 1: The row or the list has no end";
         QByteArray wide = "[{\"0\": 1";
         for (int i = 1; i <= ListTable::COLUMN_LIMIT; ++i)
             wide += ",\"" + QByteArray::number(i) + "\": 1";
-        QTest::newRow("many columns") << wide + "}]" << "The list has more than 256 columns";
+        QTest::newRow("many columns") << wide + "}]"
+                                      << "The list has more than 256 columns";
     }
     void refused()
     {

@@ -36,7 +36,8 @@ QString textsOf(const Archive& title)
 {
     QStringList texts;
     for (const TText* text : title.text())
-        texts.append(QStringLiteral("%1=").arg(text->getTextObjectID()) + QString::fromStdString(text->getText()));
+        texts.append(QStringLiteral("%1=").arg(text->getTextObjectID()) +
+                     QString::fromStdString(text->getText()));
     return texts.join(QLatin1Char(' '));
 }
 
@@ -97,7 +98,8 @@ private Q_SLOTS:
     void errors()
     {
         fill({"Name"}, {{"Anna"}});
-        QCOMPARE(make().error(), QStringLiteral("No column of the list has the name of a field of the template"));
+        QCOMPARE(make().error(),
+                 QStringLiteral("No column of the list has the name of a field of the template"));
         QVERIFY(make().rows().empty());
         setTexts({textOf({"{Name} {Role}"}, 1)});
         QCOMPARE(make().error(), QStringLiteral("The list has no column \"Role\" for \"{Role}\" in text 1"));
@@ -116,7 +118,8 @@ private Q_SLOTS:
         const QStringList rows = outcomesOf(plan);
         QCOMPARE(rows.size(), 4);
         QCOMPARE(rows[0], QStringLiteral("2: Made"));
-        QVERIFY2(rows[1].startsWith("3: Wrong, field \"2\" is ") && rows[1].endsWith("smallest size, 300 is the limit"),
+        QVERIFY2(rows[1].startsWith("3: Wrong, field \"2\" is ") &&
+                     rows[1].endsWith("smallest size, 300 is the limit"),
                  qPrintable(rows[1]));
         QCOMPARE(rows[2], QStringLiteral("4: Wrong, field \"1\" has 301 characters, 300 is the limit"));
         QCOMPARE(rows[3], QStringLiteral("9: Wrong, bad quote"));
@@ -179,8 +182,12 @@ private Q_SLOTS:
     void keys()
     {
         m_key = "id";
-        fill({"ID", "1"},
-             {{"Å 7/../x", "Anna"}, {"b", "Bo"}, {"", "Cy"}, {"b ", "Di"}, {"B", "Ed"}, {QString(500, 'k'), "Fy"}});
+        fill({"ID", "1"}, {{"Å 7/../x", "Anna"},
+                           {"b", "Bo"},
+                           {"", "Cy"},
+                           {"b ", "Di"},
+                           {"B", "Ed"},
+                           {QString(500, 'k'), "Fy"}});
         const ListPlan plan = make();
         QCOMPARE(outcomesOf(plan), QStringList({"2: Made", "3: Made", "4: Wrong, it has no key",
                                                 "5: Wrong, it has the key of line 3", "6: Made", "7: Made"}));
@@ -204,7 +211,8 @@ private Q_SLOTS:
         QVERIFY(torn.open(QIODevice::WriteOnly));
         torn.write("x");
         torn.close();
-        fill({"1", "Picture"}, {{"Anna", "a.png"}, {"Bo", good}, {"Cy", ""}, {"Di", "b.png"}, {"Ed", "c.png"}, {"", "a.png"}});
+        fill({"1", "Picture"},
+             {{"Anna", "a.png"}, {"Bo", good}, {"Cy", ""}, {"Di", "b.png"}, {"Ed", "c.png"}, {"", "a.png"}});
         const ListPlan plan = make();
         QStringList rows = outcomesOf(plan);
         QCOMPARE(rows.mid(0, 3), QStringList({"2: Made", "3: Made", "4: Made"}));
@@ -237,7 +245,8 @@ private:
 
     ListPlan make() const
     {
-        return ListPlan({m_table, *m_sample, m_fields, m_folder->filePath("lists/My list.csv"), m_folder->path(), m_key});
+        return ListPlan(
+            {m_table, *m_sample, m_fields, m_folder->filePath("lists/My list.csv"), m_folder->path(), m_key});
     }
 
     void write(const QStringList& ordered, const QStringList& files) const

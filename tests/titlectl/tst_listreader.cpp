@@ -45,7 +45,8 @@ private Q_SLOTS:
     void notFiles()
     {
         QTemporaryDir folder;
-        QCOMPARE(ListReader::read(folder.filePath("none.csv")).error(), QStringLiteral("There is no such file"));
+        QCOMPARE(ListReader::read(folder.filePath("none.csv")).error(),
+                 QStringLiteral("There is no such file"));
         QCOMPARE(ListReader::read(folder.path()).error(), QStringLiteral("It is not a file"));
         // A pipe that nobody writes to must not be waited for.
         const QString pipe = folder.filePath("pipe.csv");
@@ -55,7 +56,8 @@ private Q_SLOTS:
         QFile large(folder.filePath("large.csv"));
         QVERIFY(large.open(QIODevice::WriteOnly));
         QVERIFY(large.resize(ListTable::FILE_LIMIT + 1));
-        QCOMPARE(ListReader::read(large.fileName()).error(), QStringLiteral("The file is longer than 268435456 bytes"));
+        QCOMPARE(ListReader::read(large.fileName()).error(),
+                 QStringLiteral("The file is longer than 268435456 bytes"));
     }
 
 private:

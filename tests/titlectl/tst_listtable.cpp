@@ -30,7 +30,8 @@ private Q_SLOTS:
         QTest::newRow("twice") << QStringList{"a", "b", " A"} << "Two columns are named \"A\"";
         QTest::newRow("not UTF-8") << QStringList{QString(QChar(QChar::ReplacementCharacter))} << "not UTF-8";
         QTest::newRow("control") << QStringList{QString(QChar(7))} << "control character";
-        QTest::newRow("long") << QStringList{QString(ListTable::CELL_LIMIT + 1, 'x')} << "longer than 65536 bytes";
+        QTest::newRow("long") << QStringList{QString(ListTable::CELL_LIMIT + 1, 'x')}
+                              << "longer than 65536 bytes";
         QStringList many;
         for (int i = 0; i <= ListTable::COLUMN_LIMIT; ++i)
             many.append(QString::number(i));
@@ -58,18 +59,20 @@ private Q_SLOTS:
                                   << "7! it has text in column 3, the header has 2 columns";
         QTest::newRow("scripts") << QStringList{QString::fromUtf8("快讯 속보"), QString::fromUtf8("é😀")}
                                  << QString::fromUtf8("7: 快讯 속보|é😀");
-        QTest::newRow("line breaks") << QStringList{"a\r\nb\rc\nd", QString(QChar(QChar::LineSeparator)) + 'x'}
+        QTest::newRow("line breaks") << QStringList{"a\r\nb\rc\nd",
+                                                    QString(QChar(QChar::LineSeparator)) + 'x'}
                                      << "7: a\nb\nc\nd|\nx";
         QTest::newRow("tab") << QStringList{"a\tb"} << "7: a b|";
         QTest::newRow("control") << QStringList{"x", QString(QChar(1))}
                                  << "7! column 2: it contains a control character";
-        QTest::newRow("NUL") << QStringList{QString(QChar(0))} << "7! column 1: it contains a control character";
+        QTest::newRow("NUL") << QStringList{QString(QChar(0))}
+                             << "7! column 1: it contains a control character";
         QTest::newRow("not UTF-8") << QStringList{QString(QChar(QChar::ReplacementCharacter))}
                                    << "7! column 1: its text is not UTF-8";
-        QTest::newRow("half a character") << QStringList{QString(QChar(0xD83D))}
-                                          << "7! column 1: it contains half a character";
-        QTest::newRow("non-character") << QStringList{QString(QChar(0xFFFE))}
-                                       << "7! column 1: it contains a control character";
+        QTest::newRow("half a character")
+            << QStringList{QString(QChar(0xD83D))} << "7! column 1: it contains half a character";
+        QTest::newRow("non-character")
+            << QStringList{QString(QChar(0xFFFE))} << "7! column 1: it contains a control character";
     }
     void cells()
     {
@@ -140,8 +143,7 @@ private Q_SLOTS:
             table.addRow(row, {longest});
         QCOMPARE(table.rowCount(), fitting);
         table.addRow(fitting, {"x"});
-        QVERIFY2(table.error().startsWith("The texts of the list are longer"),
-                 qPrintable(table.error()));
+        QVERIFY2(table.error().startsWith("The texts of the list are longer"), qPrintable(table.error()));
     }
 };
 

@@ -1,4 +1,5 @@
-// Rendering in several processes: every title once, the same pictures, and a process that fails costs one title.
+// Rendering in several processes: every title once, the same pictures, and a process that fails costs one
+// title.
 #include "RenderedFolder.h"
 #include "titlectl/RenderWorker.h"
 #include "titlectl/RenderWorkers.h"
@@ -36,7 +37,8 @@ private:
     {
         QList<RenderJob> jobs;
         for (const QString& stem : stems)
-            jobs.append(RenderJob{folder + '/' + stem + ".xml", target, PictureFiles::Pictures(PictureFiles::ALL)});
+            jobs.append(
+                RenderJob{folder + '/' + stem + ".xml", target, PictureFiles::Pictures(PictureFiles::ALL)});
         return jobs;
     }
 
@@ -96,7 +98,8 @@ void tst_renderworkers::everyTitleOnce()
 void tst_renderworkers::titleThatCannotBeRead()
 {
     const QString folder = renderedFolder(m_fixture, "torn", {"a", "b"});
-    const auto errors = run(TITLECTL_PROGRAM, 2, jobsFor(folder, {"a", "gone", "b"}, m_fixture.makeFolder("target")));
+    const auto errors =
+        run(TITLECTL_PROGRAM, 2, jobsFor(folder, {"a", "gone", "b"}, m_fixture.makeFolder("target")));
     QCOMPARE(errors, (QMap<qsizetype, QString>{{0, ""}, {1, "the title cannot be read"}, {2, ""}}));
 }
 
@@ -118,7 +121,8 @@ void tst_renderworkers::workerAnswersEachLine()
 {
     const QString folder = renderedFolder(m_fixture, "worker", {"a"});
     const QList<RenderJob> jobs = jobsFor(folder, {"a", "gone"}, m_fixture.makeFolder("target"));
-    std::istringstream input(jobs.at(0).toLine().toStdString() + "noise\n" + jobs.at(1).toLine().toStdString());
+    std::istringstream input(jobs.at(0).toLine().toStdString() + "noise\n" +
+                             jobs.at(1).toLine().toStdString());
     std::ostringstream output;
     RenderWorker::serve(input, output);
     QCOMPARE(QString::fromStdString(output.str()), QString("\nnot a job\nthe title cannot be read\n"));

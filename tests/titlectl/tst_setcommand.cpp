@@ -27,7 +27,8 @@ void tst_setcommand::accepted_data()
     QTest::newRow("real new line") << QStringList{"1=a\nb"} << Changes{{1, "a\nb"}};
     QTest::newRow("backslash") << QStringList{"1=a\\\\nb"} << Changes{{1, "a\\nb"}};
     QTest::newRow("other backslashes") << QStringList{"1=\\x\\"} << Changes{{1, "\\x\\"}};
-    QTest::newRow("300 characters") << QStringList{"1=" + QString(300, 'x')} << Changes{{1, QString(300, 'x')}};
+    QTest::newRow("300 characters") << QStringList{"1=" + QString(300, 'x')}
+                                    << Changes{{1, QString(300, 'x')}};
 }
 
 void tst_setcommand::accepted()

@@ -50,8 +50,9 @@ private Q_SLOTS:
     void roundTrip()
     {
         QString error;
-        for (const QByteArray& bytes : {QByteArray("{}"), WHOLE, QByteArray(R"({"picture": "x"})"),
-                                        QByteArray(R"({"fields": {"2": {"name": "3"}, "3": {"name": "2"}}})")}) {
+        for (const QByteArray& bytes :
+             {QByteArray("{}"), WHOLE, QByteArray(R"({"picture": "x"})"),
+              QByteArray(R"({"fields": {"2": {"name": "3"}, "3": {"name": "2"}}})")}) {
             const TemplateFields fields = TemplateFields::fromJson(bytes, error);
             QCOMPARE(error, QString());
             QVERIFY(TemplateFields::fromJson(fields.toJson(), error) == fields);
@@ -68,20 +69,24 @@ private Q_SLOTS:
         QTest::newRow("fields") << QByteArray(R"({"fields": []})") << "\"fields\" is not an object";
         QTest::newRow("key") << QByteArray(R"({"field": {}})") << "\"field\" in the file is not known";
         QTest::newRow("id") << QByteArray(R"({"fields": {"5": {}}})") << "\"5\" is not the id of a text";
-        QTest::newRow("id with a sign") << QByteArray(R"({"fields": {"+1": {}}})") << "\"+1\" is not the id of a text";
-        QTest::newRow("field") << QByteArray(R"({"fields": {"1": "x"}})") << "The field \"1\" is not an object";
+        QTest::newRow("id with a sign")
+            << QByteArray(R"({"fields": {"+1": {}}})") << "\"+1\" is not the id of a text";
+        QTest::newRow("field") << QByteArray(R"({"fields": {"1": "x"}})")
+                               << "The field \"1\" is not an object";
         QTest::newRow("field key") << QByteArray(R"({"fields": {"1": {"nmae": "x"}}})")
                                    << "\"nmae\" in field \"1\" is not known";
-        QTest::newRow("name") << QByteArray(R"({"fields": {"1": {"name": 5}}})") << "The name in \"1\" is not a text";
+        QTest::newRow("name") << QByteArray(R"({"fields": {"1": {"name": 5}}})")
+                              << "The name in \"1\" is not a text";
         QTest::newRow("blank name") << QByteArray(R"({"fields": {"1": {"name": " "}}})")
                                     << "The name in \"1\" is not a text";
-        QTest::newRow("brace") << QByteArray(R"({"fields": {"1": {"name": "{a"}}})") << "The name \"{a\" has a brace";
+        QTest::newRow("brace") << QByteArray(R"({"fields": {"1": {"name": "{a"}}})")
+                               << "The name \"{a\" has a brace";
         QTest::newRow("twice") << QByteArray(R"({"fields": {"1": {"name": "a"}, "2": {"name": "A"}}})")
                                << "Two fields are named \"A\"";
-        QTest::newRow("usual name twice") << QByteArray(R"({"fields": {"1": {"name": "2"}}})")
-                                          << "Two fields are named \"2\"";
-        QTest::newRow("picture twice") << QByteArray(R"({"fields": {"1": {"name": "Picture"}}})")
-                                       << "Two fields are named \"picture\"";
+        QTest::newRow("usual name twice")
+            << QByteArray(R"({"fields": {"1": {"name": "2"}}})") << "Two fields are named \"2\"";
+        QTest::newRow("picture twice")
+            << QByteArray(R"({"fields": {"1": {"name": "Picture"}}})") << "Two fields are named \"picture\"";
         QTest::newRow("fit") << QByteArray(R"({"fields": {"1": {"fit": 600}}})")
                              << "\"fit\" of field \"1\" is not an object";
         QTest::newRow("no width") << QByteArray(R"({"fields": {"1": {"fit": {}}}})")
@@ -90,7 +95,8 @@ private Q_SLOTS:
                                  << "\"width\" of field \"1\" is not a number from 1 to 1280";
         QTest::newRow("half a pixel") << QByteArray(R"({"fields": {"1": {"fit": {"width": 10.5}}}})")
                                       << "\"width\" of field \"1\" is not a number from 1 to 1280";
-        QTest::newRow("smallest") << QByteArray(R"({"fields": {"1": {"fit": {"width": 9, "smallest": 1000}}}})")
+        QTest::newRow("smallest") << QByteArray(
+                                         R"({"fields": {"1": {"fit": {"width": 9, "smallest": 1000}}}})")
                                   << "\"smallest\" of field \"1\" is not a number from 1 to 999";
     }
     void refused()

@@ -26,7 +26,8 @@ private Q_SLOTS:
         QTest::newRow("not opened") << QStringList{"a}"} << QStringList();
         QTest::newRow("empty") << QStringList{"{}{ }"} << QStringList();
         QTest::newRow("line break") << QStringList{"{a\nb}{c}"} << QStringList{"c"};
-        QTest::newRow("scripts") << QStringList{QString::fromUtf8("😀{名前}")} << QStringList{QString::fromUtf8("名前")};
+        QTest::newRow("scripts") << QStringList{QString::fromUtf8("😀{名前}")}
+                                 << QStringList{QString::fromUtf8("名前")};
     }
     void partNames()
     {
@@ -39,12 +40,18 @@ private Q_SLOTS:
         QTest::addColumn<QStringList>("text");
         QTest::addColumn<QString>("value");
         QTest::addColumn<QString>("sizes");
-        QTest::newRow("shorter") << QStringList{"Name", " of guest"} << "Ève" << "Ève:40";
-        QTest::newRow("longer") << QStringList{"N", "x"} << "Anna Müller" << "Anna Müller:40";
-        QTest::newRow("lines") << QStringList{"N"} << "a\nb" << "a\nb:40";
-        QTest::newRow("empty") << QStringList{"N"} << "" << "";
-        QTest::newRow("braces") << QStringList{"N"} << "{x}" << "{x}:40";
-        QTest::newRow("pairs") << QStringList{QString::fromUtf8("😀x")} << QString::fromUtf8("é😀快") << QString::fromUtf8("é😀快:40");
+        QTest::newRow("shorter") << QStringList{"Name", " of guest"} << "Ève"
+                                 << "Ève:40";
+        QTest::newRow("longer") << QStringList{"N", "x"} << "Anna Müller"
+                                << "Anna Müller:40";
+        QTest::newRow("lines") << QStringList{"N"} << "a\nb"
+                               << "a\nb:40";
+        QTest::newRow("empty") << QStringList{"N"} << ""
+                               << "";
+        QTest::newRow("braces") << QStringList{"N"} << "{x}"
+                                << "{x}:40";
+        QTest::newRow("pairs") << QStringList{QString::fromUtf8("😀x")} << QString::fromUtf8("é😀快")
+                               << QString::fromUtf8("é😀快:40");
     }
     void replaceAll()
     {
@@ -64,8 +71,10 @@ private Q_SLOTS:
         QTest::addColumn<QStringList>("text");
         QTest::addColumn<QString>("sizes");
         QTest::newRow("whole") << QStringList{"{Name}"} << QString::fromUtf8("Ève 😀:40");
-        QTest::newRow("inside") << QStringList{"by ", "{Name}", " now"} << QString::fromUtf8("by :40 Ève 😀:50  now:60");
-        QTest::newRow("across runs") << QStringList{"x{N", "am", "e}y"} << QString::fromUtf8("xÈve 😀:40 y:60");
+        QTest::newRow("inside") << QStringList{"by ", "{Name}", " now"}
+                                << QString::fromUtf8("by :40 Ève 😀:50  now:60");
+        QTest::newRow("across runs") << QStringList{"x{N", "am", "e}y"}
+                                     << QString::fromUtf8("xÈve 😀:40 y:60");
         QTest::newRow("unknown") << QStringList{"{x} ", "{Role}"} << "{x} :40 {Name}:50";
         QTest::newRow("empty value") << QStringList{"a{Empty}", "b"} << "a:40 b:50";
         QTest::newRow("nothing") << QStringList{"a", "b"} << "a:40 b:50";

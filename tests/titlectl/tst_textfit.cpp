@@ -49,12 +49,14 @@ double paintedWidth(const TText& text, double ratio, bool isBig)
 
 double paintedWidth(const TText& text)
 {
-    return std::max(paintedWidth(text, TextObjectConstants::SCENEPERCENTAGE, false), paintedWidth(text, 1.0, true));
+    return std::max(paintedWidth(text, TextObjectConstants::SCENEPERCENTAGE, false),
+                    paintedWidth(text, 1.0, true));
 }
 
 TText name(int length, int size, int outline = -1)
 {
-    static const QString LETTERS = QString::fromUtf8("Wilhelmine Müller-Ångström von und zu Île d'Or 快讯 記者 속보 ");
+    static const QString LETTERS =
+        QString::fromUtf8("Wilhelmine Müller-Ångström von und zu Île d'Or 快讯 記者 속보 ");
     TText text = textOf({"x"});
     text.textItems().front()->setFontSize(size);
     if (outline >= 0) {
@@ -95,7 +97,8 @@ private Q_SLOTS:
         const TText text = name(length, size, outline);
         const double painted = paintedWidth(text);
         const double ink = TextFit::inkWidth(text);
-        QVERIFY2(painted <= ink && ink <= painted + 6.0, qPrintable(QStringLiteral("%1 %2").arg(painted).arg(ink)));
+        QVERIFY2(painted <= ink && ink <= painted + 6.0,
+                 qPrintable(QStringLiteral("%1 %2").arg(painted).arg(ink)));
     }
 
     void nothingIsDrawn()

@@ -102,9 +102,12 @@ void tst_titlepaths::refused_data()
 {
     QTest::addColumn<QString>("name");
     QTest::addColumn<QString>("reason");
-    QTest::newRow("missing") << "gone.xml" << "does not exist";
-    QTest::newRow("a picture") << "a_1920.png" << "neither a title file nor a folder";
-    QTest::newRow("the order") << ".order.xml" << "neither a title file nor a folder";
+    QTest::newRow("missing") << "gone.xml"
+                             << "does not exist";
+    QTest::newRow("a picture") << "a_1920.png"
+                               << "neither a title file nor a folder";
+    QTest::newRow("the order") << ".order.xml"
+                               << "neither a title file nor a folder";
 }
 
 void tst_titlepaths::refused()

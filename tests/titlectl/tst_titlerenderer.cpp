@@ -64,7 +64,8 @@ void tst_titlerenderer::oneSize()
     QFETCH(QStringList, names);
     const QString folder = renderedFolder(m_fixture, "size", {"one"});
     const QString other = m_fixture.makeFolder("sizes");
-    QCOMPARE(TitleRenderer().render({folder + "/one.xml", other, PictureFiles::Pictures(pictures)}), QString());
+    QCOMPARE(TitleRenderer().render({folder + "/one.xml", other, PictureFiles::Pictures(pictures)}),
+             QString());
     QCOMPARE(QStringList(picturesIn(other).keys()), names);
 }
 
@@ -88,8 +89,12 @@ void tst_titlerenderer::errors_data()
     QTest::addColumn<QString>("title");
     QTest::addColumn<QString>("folder");
     QTest::addColumn<QString>("reason");
-    QTest::newRow("no title") << "gone.xml" << "" << "cannot be read";
-    QTest::newRow("no folder") << "one.xml" << "/nonexistent/folder" << "No such file or directory";
+    QTest::newRow("no title") << "gone.xml"
+                              << ""
+                              << "cannot be read";
+    QTest::newRow("no folder") << "one.xml"
+                               << "/nonexistent/folder"
+                               << "No such file or directory";
 }
 
 void tst_titlerenderer::errors()

@@ -51,15 +51,24 @@ void tst_titletexts::stylesOfTheCharacters_data()
     QTest::addColumn<QString>("before");
     QTest::addColumn<QString>("after");
     QTest::addColumn<QList<int>>("sizes");
-    QTest::newRow("the same") << "abc" << "abc" << QList<int>{40, 41, 42};
-    QTest::newRow("another text") << "abc" << "xyzw" << QList<int>{40, 40, 40, 40};
-    QTest::newRow("in the middle") << "abcd" << "axyd" << QList<int>{40, 41, 41, 43};
-    QTest::newRow("added at the end") << "ab" << "abc" << QList<int>{40, 41, 41};
-    QTest::newRow("added at the beginning") << "ab" << "xab" << QList<int>{40, 40, 41};
-    QTest::newRow("added in the middle") << "ab" << "axb" << QList<int>{40, 40, 41};
-    QTest::newRow("removed") << "abcd" << "ad" << QList<int>{40, 43};
-    QTest::newRow("a repeated letter") << "aa" << "aaa" << QList<int>{40, 41, 41};
-    QTest::newRow("a new line") << "ab" << "a\nb" << QList<int>{40, 40, 41};
+    QTest::newRow("the same") << "abc"
+                              << "abc" << QList<int>{40, 41, 42};
+    QTest::newRow("another text") << "abc"
+                                  << "xyzw" << QList<int>{40, 40, 40, 40};
+    QTest::newRow("in the middle") << "abcd"
+                                   << "axyd" << QList<int>{40, 41, 41, 43};
+    QTest::newRow("added at the end") << "ab"
+                                      << "abc" << QList<int>{40, 41, 41};
+    QTest::newRow("added at the beginning") << "ab"
+                                            << "xab" << QList<int>{40, 40, 41};
+    QTest::newRow("added in the middle") << "ab"
+                                         << "axb" << QList<int>{40, 40, 41};
+    QTest::newRow("removed") << "abcd"
+                             << "ad" << QList<int>{40, 43};
+    QTest::newRow("a repeated letter") << "aa"
+                                       << "aaa" << QList<int>{40, 41, 41};
+    QTest::newRow("a new line") << "ab"
+                                << "a\nb" << QList<int>{40, 40, 41};
 }
 
 void tst_titletexts::stylesOfTheCharacters()

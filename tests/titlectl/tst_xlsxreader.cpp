@@ -14,15 +14,17 @@
 namespace
 {
 
-const QByteArray STRINGS = "<si><t>Name</t></si><si><t>Role</t></si>"
-                           "<si><r><t>M\xC3\xBC</t></r><r><rPr><b/></rPr><t xml:space=\"preserve\">ller </t></r>"
-                           "<rPh sb=\"0\" eb=\"1\"><t>phonetic</t></rPh></si>"
-                           "<si><t>first_x000D_\nsecond _x005F_x &lt;&amp;</t></si>";
+const QByteArray STRINGS =
+    "<si><t>Name</t></si><si><t>Role</t></si>"
+    "<si><r><t>M\xC3\xBC</t></r><r><rPr><b/></rPr><t xml:space=\"preserve\">ller </t></r>"
+    "<rPh sb=\"0\" eb=\"1\"><t>phonetic</t></rPh></si>"
+    "<si><t>first_x000D_\nsecond _x005F_x &lt;&amp;</t></si>";
 
 const QByteArray ROWS =
     "<row r=\"2\"><c r=\"A2\" s=\"1\"/></row>"
     "<row r=\"3\"><c r=\"B3\" t=\"s\"><v>0</v></c><c r=\"D3\" t=\"s\"><v>1</v></c></row>"
-    "<row r=\"4\"><c r=\"B4\" t=\"s\"><v>2</v></c><c r=\"C4\"><v>7</v></c><c r=\"D4\" t=\"s\"><v>3</v></c></row>"
+    "<row r=\"4\"><c r=\"B4\" t=\"s\"><v>2</v></c><c r=\"C4\"><v>7</v></c><c r=\"D4\" "
+    "t=\"s\"><v>3</v></c></row>"
     "<row r=\"7\"><c r=\"D7\" t=\"inlineStr\"><is><t>inline</t></is></c></row>"
     "<row><c/><c><v>1.1000000000000001</v></c><c/><c t=\"b\"><v>1</v></c></row>"
     "<row r=\"9\"><c r=\"B9\" t=\"str\"><f>A1</f><v>formula</v></c><c r=\"ZZ9\" s=\"4\"/></row>";
@@ -46,8 +48,8 @@ private Q_SLOTS:
         const ListTable table = read({ROWS, STRINGS, isPacked});
         QCOMPARE(table.error(), QString());
         QCOMPARE(headerOf(table), QStringLiteral("|Name||Role"));
-        QCOMPARE(rowsOf(table), QStringList({QString::fromUtf8("4: |Müller |7|first\nsecond _x <&"), "7: |||inline",
-                                             "8: |1.1||TRUE", "9: |formula||"}));
+        QCOMPARE(rowsOf(table), QStringList({QString::fromUtf8("4: |Müller |7|first\nsecond _x <&"),
+                                             "7: |||inline", "8: |1.1||TRUE", "9: |formula||"}));
     }
 
     void badRowsDoNotStopTheOthers()
@@ -60,7 +62,8 @@ private Q_SLOTS:
                                       "<row r=\"6\"><c r=\"5\"><v>1</v></c></row>"
                                       "<row r=\"7\"><c r=\"A7\"><v>2</v></c></row>",
                                       STRINGS});
-        QCOMPARE(rowsOf(table), QStringList({"2! column 1 has the error #N/A", "3! column 1 refers to a text that is missing",
+        QCOMPARE(rowsOf(table), QStringList({"2! column 1 has the error #N/A",
+                                             "3! column 1 refers to a text that is missing",
                                              "4! column 1 refers to a text that is missing",
                                              "5! it has text in column 2, the header has 1 columns",
                                              "6! a cell has no column", "7: 2"}));
@@ -73,7 +76,8 @@ private Q_SLOTS:
         const QByteArray longText(ListTable::CELL_LIMIT + 1, 'x');
         QTest::newRow("empty") << WorkbookFile::sheet("") << "The list is empty";
         QTest::newRow("not XML") << QByteArray("x") << "The workbook cannot be read: ";
-        QTest::newRow("torn") << WorkbookFile::sheet("<row><c><v>1").chopped(35) << "The workbook cannot be read: ";
+        QTest::newRow("torn") << WorkbookFile::sheet("<row><c><v>1").chopped(35)
+                              << "The workbook cannot be read: ";
         QTest::newRow("long cell") << WorkbookFile::sheet("<row><c><v>" + longText + "</v></c></row>")
                                    << "A cell is longer than 65536 bytes";
         QTest::newRow("long inline text")
@@ -81,18 +85,22 @@ private Q_SLOTS:
             << "A cell is longer than 65536 bytes";
         QTest::newRow("column") << WorkbookFile::sheet("<row><c r=\"IW1\"><v>1</v></c></row>")
                                 << "The list has more than 256 columns";
-        QTest::newRow("error in the header") << WorkbookFile::sheet("<row r=\"3\"><c t=\"e\"><v>#REF!</v></c></row>")
-                                             << "row 3: The header cannot be used";
+        QTest::newRow("error in the header")
+            << WorkbookFile::sheet("<row r=\"3\"><c t=\"e\"><v>#REF!</v></c></row>")
+            << "row 3: The header cannot be used";
         QTest::newRow("entity") << QByteArray("<!DOCTYPE a [<!ENTITY b \"c\">]><a>&b;</a>")
                                 << "The workbook cannot be read: Its XML is not that of a workbook";
         QTest::newRow("comment") << QByteArray("<a><!-- x --></a>")
                                  << "The workbook cannot be read: Its XML is not that of a workbook";
-        QTest::newRow("deep") << QByteArray("<a>").repeated(1000) << "The workbook cannot be read: Its XML is too deep";
+        QTest::newRow("deep") << QByteArray("<a>").repeated(1000)
+                              << "The workbook cannot be read: Its XML is too deep";
         QByteArray attributes = "<a";
         for (int i = 0; i < 5000; ++i)
             attributes += " a" + QByteArray::number(i) + "=\"\"";
-        QTest::newRow("attributes") << attributes + "/>" << "The workbook cannot be read: Its XML is not that of a workbook";
-        QTest::newRow("long text") << QByteArray("<a>") + QByteArray(ZipXmlEntry::TEXT_LIMIT + 1, 'x') + "</a>"
+        QTest::newRow("attributes") << attributes + "/>"
+                                    << "The workbook cannot be read: Its XML is not that of a workbook";
+        QTest::newRow("long text") << QByteArray("<a>") + QByteArray(ZipXmlEntry::TEXT_LIMIT + 1, 'x') +
+                                          "</a>"
                                    << "The workbook cannot be read: Its XML is not that of a workbook";
         QTest::newRow("encoding") << QByteArray("<?xml version=\"1.0\" encoding=\"ISO-8859-1\"?><a/>")
                                   << "The workbook cannot be read: Its XML is not UTF-8";
