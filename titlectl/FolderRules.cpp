@@ -3,9 +3,11 @@
 #include "document/TitleParser.h"
 #include "support/HiddenName.h"
 #include "titlectl/CheckedFolder.h"
+#include "titlectl/TitleStage.h"
 
 #include <QFileInfo>
 #include <QSet>
+#include <QStringList>
 
 namespace
 {
@@ -70,6 +72,12 @@ void checkLeftovers(const CheckedFolder& folder, FindingList& findings)
     for (const QString& name : folder.otherFiles())
         if (const QString kind = leftoverKind(folder, name); !kind.isEmpty())
             findings.append({folder.pathOf(name), {}, {}, kind});
+    const QStringList stages = TitleStage::abandonedIn(folder.path());
+    for (const QString& stage : stages)
+        findings.append({folder.pathOf(stage),
+                         {},
+                         {},
+                         QStringLiteral("a titlectl that was interrupted left this folder")});
 }
 
 } // namespace

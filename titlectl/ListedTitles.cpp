@@ -1,7 +1,6 @@
 #include "titlectl/ListedTitles.h"
 
 #include "document/Archive.h"
-#include "document/FolderOrder.h"
 #include "document/PictureReader.h"
 #include "document/PngWriter.h"
 #include "document/TitleParser.h"
@@ -14,13 +13,12 @@
 #include <QFile>
 #include <QFileInfo>
 #include <QImage>
-#include <QSet>
 #include <QSize>
 #include <cerrno>
 #include <chrono>
 #include <cstring>
+#include <unordered_set>
 #include <utility>
-#include <vector>
 
 namespace
 {
@@ -162,28 +160,51 @@ QString ListedTitles::stageBackground(Archive& title, int row) const
     return error;
 }
 
+// Returns the file name of the title of a row that was made; empty for any other.
+std::string ListedTitles::fileOf(qsizetype row) const
+{
+    const ListPlan::Row& planned = m_plan.rows()[std::size_t(row)];
+    if (planned.outcome == ListPlan::Outcome::Wrong || !m_errors.at(row).isEmpty())
+        return {};
+    return (planned.stem + TitleFileOperations::XML_EXTENSION).toStdString();
+}
+
+// Returns the titles that the order names. Without a whole order file it is made of all titles that are
+// there; those of the list are left out then, since they come in the order of their rows.
+std::vector<ArchiveOrder> ListedTitles::orderBefore(bool isWhole) const
+{
+    std::vector<ArchiveOrder> order = FolderOrder::rowsToShow(m_folder.toStdString());
+    if (isWhole)
+        return order;
+    std::unordered_set<std::string> made;
+    for (qsizetype row = 0; row < m_errors.size(); ++row)
+        made.insert(fileOf(row));
+    std::erase_if(order, [&](const ArchiveOrder& title) { return made.contains(title.getArchivePath()); });
+    for (std::size_t i = 0; i < order.size(); ++i)
+        order[i].setArchiveIndex(int(i));
+    return order;
+}
+
 // Appends the titles that the order does not name yet, in the order of their rows.
 void ListedTitles::nameNewTitles()
 {
     const std::string folder = m_folder.toStdString();
-    std::vector<ArchiveOrder> order = FolderOrder::rowsToShow(folder);
-    QSet<QString> known;
-    for (const ArchiveOrder& row : order)
-        known.insert(QString::fromStdString(row.getArchivePath()));
+    const bool isWhole = FolderOrder::stateOf(folder) == FolderOrder::State::Whole;
+    std::vector<ArchiveOrder> order = orderBefore(isWhole);
+    std::unordered_set<std::string> known;
+    for (const ArchiveOrder& title : order)
+        known.insert(title.getArchivePath());
     QList<qsizetype> added;
-    for (std::size_t i = 0; i < m_plan.rows().size(); ++i) {
-        const ListPlan::Row& row = m_plan.rows()[i];
-        const QString file = row.stem + TitleFileOperations::XML_EXTENSION;
-        if (row.outcome == ListPlan::Outcome::Wrong || !m_errors.at(qsizetype(i)).isEmpty() ||
-            known.contains(file))
+    for (qsizetype row = 0; row < m_errors.size(); ++row) {
+        const std::string file = fileOf(row);
+        if (file.empty() || known.contains(file))
             continue;
         ArchiveOrder title;
         title.setArchiveIndex(int(order.size()));
-        title.setArchivePath(file.toStdString());
+        title.setArchivePath(file);
         order.push_back(title);
-        added.append(qsizetype(i));
+        added.append(row);
     }
-    const bool isWhole = FolderOrder::stateOf(folder) == FolderOrder::State::Whole;
     if ((added.isEmpty() && isWhole) || FolderOrder::write(folder, order))
         return;
     const QString error = QStringLiteral("the order of the folder cannot be written: %1").arg(lastError());

@@ -1,5 +1,6 @@
 #pragma once
 
+#include "document/FolderOrder.h"
 #include "titlectl/ListPlan.h"
 
 #include <QList>
@@ -7,6 +8,8 @@
 #include <QStringList>
 #include <functional>
 #include <memory>
+#include <string>
+#include <vector>
 
 class Archive;
 class TitleStage;
@@ -31,6 +34,8 @@ private:
                    const std::function<void()>& oneDone);
     QString stageTitle(const TitleStage& stage, int row) const;
     QString stageBackground(Archive& title, int row) const;
+    std::string fileOf(qsizetype row) const;
+    std::vector<ArchiveOrder> orderBefore(bool isWhole) const;
     void nameNewTitles();
 
     const ListPlan& m_plan;

@@ -17,6 +17,19 @@ namespace
 const QString OUT = QStringLiteral("out");
 const QString ONLY = QStringLiteral("only");
 
+// Returns the name that two of the folders have; empty if there is none.
+QString nameOfTwo(const QList<TitlePaths::Folder>& folders)
+{
+    QStringList names;
+    for (const TitlePaths::Folder& folder : folders) {
+        const QString name = QFileInfo(folder.path).fileName();
+        if (names.contains(name))
+            return name;
+        names.append(name);
+    }
+    return {};
+}
+
 // Returns the folders that the jobs write to.
 QStringList targetsOf(const QList<RenderJob>& jobs)
 {
@@ -87,6 +100,8 @@ int RenderCommand::run(const Arguments& arguments, Output& output)
         return refuse(paths.error());
     const QString out =
         arguments.has(OUT) ? QDir::cleanPath(QFileInfo(arguments.value(OUT)).absoluteFilePath()) : QString();
+    if (const QString name = nameOfTwo(paths.folders()); !out.isEmpty() && !name.isEmpty())
+        return refuse(QStringLiteral("two folders are named %1; --out would mix their pictures").arg(name));
     const QList<RenderJob> jobs = jobsFor(paths.folders(), out, *pictures);
     FolderLocks locks;
     const auto kind = out.isEmpty() ? FolderLock::Kind::Exclusive : FolderLock::Kind::Shared;

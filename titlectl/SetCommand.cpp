@@ -3,20 +3,26 @@
 #include "canvas/TextObjectConstants.h"
 #include "document/Archive.h"
 #include "document/TitleParser.h"
+#include "support/FileSyncQueue.h"
 #include "titlectl/Arguments.h"
 #include "titlectl/FolderLocks.h"
 #include "titlectl/Output.h"
 #include "titlectl/TitleDescription.h"
 #include "titlectl/TitlePaths.h"
 #include "titlectl/TitleRenderer.h"
+#include "titlectl/TitleStage.h"
 #include "titlectl/TitleTexts.h"
 
+#include <QFileInfo>
 #include <QJsonDocument>
 #include <cerrno>
+#include <chrono>
 #include <cstring>
 
 namespace
 {
+
+constexpr std::chrono::seconds SYNC_LIMIT(60);
 
 // Returns the text with "\n" and "\\" replaced by what they stand for.
 QString unescaped(const QString& text)
@@ -106,19 +112,30 @@ int SetCommand::run(const Arguments& arguments, Output& output)
     return save(archive, output);
 }
 
-// Draws first and writes the title before its pictures, which are thus never newer than what they show.
-int SetCommand::save(Archive& archive, Output& output)
+QString SetCommand::stageTitle(Archive archive, const TitleStage& stage)
 {
-    const QString file = QString::fromStdString(archive.getPath());
-    TitleRenderer renderer;
-    const QList<QImage> images = renderer.draw(archive);
-    if (TitleParser().writeOneTitle(&archive) != 1) {
-        output.message(QStringLiteral("%1: %2").arg(file, QString::fromLocal8Bit(std::strerror(errno))));
-        return Findings;
-    }
-    const QString error = TitleRenderer::write(archive, images, PictureFiles::Pictures(PictureFiles::ALL));
+    if (!stage.isValid())
+        return stage.error();
+    // Drawn first, since the record names its background beside the title.
+    const QList<QImage> images = TitleRenderer().draw(archive);
+    const QString file = QFileInfo(QString::fromStdString(archive.getPath())).fileName();
+    archive.setPath((stage.path() + QLatin1Char('/') + file).toStdString());
+    if (TitleParser().writeOneTitle(&archive) != 1)
+        return QString::fromLocal8Bit(std::strerror(errno));
+    return TitleRenderer::write(archive, images, PictureFiles::Pictures(PictureFiles::ALL));
+}
+
+int SetCommand::save(const Archive& archive, Output& output)
+{
+    const QFileInfo file(QString::fromStdString(archive.getPath()));
+    const TitleStage newFiles(file.path());
+    QString error = stageTitle(archive, newFiles);
+    if (error.isEmpty() && !FileSyncQueue::flush(SYNC_LIMIT))
+        error = QStringLiteral("the disk does not take the files");
+    if (error.isEmpty())
+        error = newFiles.place();
     if (!error.isEmpty()) {
-        output.message(QStringLiteral("%1: %2").arg(file, error));
+        output.message(QStringLiteral("%1: %2").arg(file.filePath(), error));
         return Findings;
     }
     const TitleDescription title(archive);

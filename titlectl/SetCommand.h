@@ -8,6 +8,7 @@
 #include <optional>
 
 class Archive;
+class TitleStage;
 
 // titlectl set: changes texts of a title and makes its pictures.
 class SetCommand : public Command
@@ -26,5 +27,7 @@ public:
     static std::optional<Changes> parse(const QStringList& words, QString& error);
 
 private:
-    static int save(Archive& archive, Output& output);
+    // Writes the title and its pictures to the stage. Returns what went wrong, or an empty string.
+    static QString stageTitle(Archive archive, const TitleStage& stage);
+    static int save(const Archive& archive, Output& output);
 };

@@ -3,6 +3,7 @@
 #include "canvas/StyleDocument.h"
 #include "document/TText.h"
 #include "document/TextStyle.h"
+#include "titlectl/TitleTexts.h"
 
 #include <memory>
 #include <utility>
@@ -19,14 +20,6 @@ struct Part {
     qsizetype end = 0;
     QString name;
 };
-
-QString plainText(const TText& text)
-{
-    QString result;
-    for (const TextStyle* style : text.textItems())
-        result += StyleDocument::textOf(*style);
-    return result;
-}
 
 std::vector<Part> partsOf(const QString& text)
 {
@@ -64,8 +57,7 @@ void setStyles(TText& text, Styles styles)
         items.push_back(style.release());
     text.releaseVectorTextStyle();
     text.setTextItems(std::move(items));
-    // The canvas stores plain spaces here.
-    text.setText(plainText(text).replace(QChar(QChar::Nbsp), QLatin1Char(' ')).toStdString());
+    TitleTexts::refreshText(text);
 }
 
 } // namespace
@@ -75,7 +67,7 @@ QStringList TextFields::partNames(const TText& text)
     TText record = text;
     StyleDocument::normalise(record);
     QStringList names;
-    for (const Part& part : partsOf(plainText(record)))
+    for (const Part& part : partsOf(TitleTexts::plainText(record)))
         if (!names.contains(part.name))
             names.append(part.name);
     return names;
@@ -100,7 +92,7 @@ void TextFields::replaceParts(TText& text, const Values& values)
         for (; at < end; ++at)
             styles.push_back(std::make_unique<TextStyle>(*items[std::size_t(at)]));
     };
-    for (const Part& part : partsOf(plainText(text))) {
+    for (const Part& part : partsOf(TitleTexts::plainText(text))) {
         const std::optional<QString> value = values(part.name);
         if (!value)
             continue;
@@ -114,11 +106,11 @@ void TextFields::replaceParts(TText& text, const Values& values)
 
 int TextFields::characterCount(const TText& text)
 {
-    const QString plain = plainText(text);
+    const QString plain = TitleTexts::plainText(text);
     return int(plain.size() - plain.count(QLatin1Char('\n')));
 }
 
 bool TextFields::isBlank(const TText& text)
 {
-    return plainText(text).trimmed().isEmpty();
+    return TitleTexts::plainText(text).trimmed().isEmpty();
 }

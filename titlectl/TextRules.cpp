@@ -6,8 +6,8 @@
 #include "document/TText.h"
 #include "document/TextStyle.h"
 #include "titlectl/CheckedTitle.h"
+#include "titlectl/TextFields.h"
 #include "titlectl/TitleInk.h"
-#include "titlectl/TitleTexts.h"
 
 #include <QFile>
 #include <QGlyphRun>
@@ -27,11 +27,6 @@ constexpr double FROM_CANVAS = 1.5;
 // How a text stands on the picture and whether it is seen. The first that holds counts.
 enum class Sight { Good, Blank, WithoutSize, Outside, CutOff, NoInk, LikeItsGround, OutsideSafeArea };
 
-bool isBlank(const TText& text)
-{
-    return TitleTexts::plainText(text).trimmed().isEmpty();
-}
-
 bool isWithoutSize(const TText& text)
 {
     return std::all_of(text.textItems().begin(), text.textItems().end(),
@@ -46,7 +41,7 @@ QRect safeArea()
 
 Sight sightOf(const TText& text, const TitleInk::Text& drawn)
 {
-    if (isBlank(text))
+    if (TextFields::isBlank(text))
         return Sight::Blank;
     if (isWithoutSize(text))
         return Sight::WithoutSize;

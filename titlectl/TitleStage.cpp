@@ -17,8 +17,7 @@ const QString PREFIX = QStringLiteral(".titlectl-");
 // Returns the folder, without the stages of killed processes.
 QString swept(const QString& folder)
 {
-    const QStringList stages =
-        QDir(folder).entryList({PREFIX + QLatin1Char('*')}, QDir::Dirs | QDir::Hidden | QDir::NoSymLinks);
+    const QStringList stages = TitleStage::abandonedIn(folder);
     for (const QString& stage : stages)
         QDir(folder + QLatin1Char('/') + stage).removeRecursively();
     return folder;
@@ -37,6 +36,19 @@ int rankOf(const QString& file)
 TitleStage::TitleStage(const QString& folder)
     : m_folder(swept(folder)), m_stage(folder + QLatin1Char('/') + PREFIX + QStringLiteral("XXXXXX"))
 {
+    if (isValid())
+        m_lock.take(path().toStdString(), FolderLock::Kind::Exclusive);
+}
+
+QStringList TitleStage::abandonedIn(const QString& folder)
+{
+    QStringList stages =
+        QDir(folder).entryList({PREFIX + QLatin1Char('*')}, QDir::Dirs | QDir::Hidden | QDir::NoSymLinks);
+    stages.removeIf([&](const QString& stage) {
+        const QString path = folder + QLatin1Char('/') + stage;
+        return FolderLock().take(path.toStdString(), FolderLock::Kind::Exclusive) == FolderLock::Result::Busy;
+    });
+    return stages;
 }
 
 QStringList TitleStage::filesOf(const QString& stem) const
@@ -44,7 +56,8 @@ QStringList TitleStage::filesOf(const QString& stem) const
     QStringList files;
     const QStringList all = QDir(m_stage.path()).entryList(QDir::Files | QDir::Hidden);
     for (const QString& file : all)
-        if (file == stem + TitleFileOperations::XML_EXTENSION || file.startsWith(stem + QLatin1Char('_')))
+        if (stem.isEmpty() || file == stem + TitleFileOperations::XML_EXTENSION ||
+            file.startsWith(stem + QLatin1Char('_')))
             files.append(file);
     std::stable_sort(files.begin(), files.end(),
                      [](const QString& a, const QString& b) { return rankOf(a) < rankOf(b); });

@@ -1,11 +1,10 @@
 #include "titlectl/TitleTexts.h"
 
-#include "canvas/GraphicsText.h"
 #include "canvas/StyleDocument.h"
-#include "canvas/TextObjectConstants.h"
 #include "document/Archive.h"
 #include "document/TText.h"
 #include "document/TextStyle.h"
+#include "titlectl/TextFit.h"
 
 #include <algorithm>
 #include <memory>
@@ -13,15 +12,6 @@
 
 namespace
 {
-
-// Returns the width of the text as the canvas lays it out.
-double widthOnCanvas(TText& text)
-{
-    GraphicsText item(&text, 0);
-    item.setRadio(TextObjectConstants::SCENEPERCENTAGE, false);
-    item.initShowText();
-    return item.layoutRect().width();
-}
 
 // Returns how many characters at the beginning are equal; never half of a pair.
 qsizetype equalAtBegin(const QString& a, const QString& b)
@@ -54,6 +44,11 @@ QString TitleTexts::plainText(const TText& text)
     return characters;
 }
 
+void TitleTexts::refreshText(TText& text)
+{
+    text.setText(plainText(text).replace(QChar(QChar::Nbsp), QLatin1Char(' ')).toStdString());
+}
+
 TText* TitleTexts::find(const Archive& archive, int id)
 {
     for (TText* text : archive.text())
@@ -65,8 +60,8 @@ TText* TitleTexts::find(const Archive& archive, int id)
 void TitleTexts::replace(TText& text, const QString& characters)
 {
     StyleDocument::normalise(text); // one style for each position
+    const TText record = text;
     const QString before = plainText(text);
-    const double widthBefore = widthOnCanvas(text);
     const qsizetype begin = equalAtBegin(before, characters);
     const qsizetype end = equalAtEnd(before, characters, begin);
 
@@ -87,9 +82,6 @@ void TitleTexts::replace(TText& text, const QString& characters)
     std::for_each(firstReplaced, firstKept, [](TextStyle* replaced) { delete replaced; });
     result.insert(result.end(), firstKept, styles.end());
     text.setTextItems(std::move(result));
-    text.setText(characters.toStdString());
-
-    // -1 left, 0 centre, 1 right
-    const double share = std::clamp(text.getTextAlign() + 1, 0, 2) / 2.0;
-    text.setXValue(static_cast<float>(text.getXValue() + share * (widthBefore - widthOnCanvas(text))));
+    refreshText(text);
+    TextFit::keepAlignment(text, record);
 }

@@ -14,6 +14,9 @@ public:
     // Returns the characters of the runs; lines end with "\n".
     static QString plainText(const TText& text);
 
+    // Sets the text of the object to the characters of its runs, as the canvas does before a title is saved.
+    static void refreshText(TText& text);
+
     // Returns the text object with this id, or null. The record keeps owning it.
     static TText* find(const Archive& archive, int id);
 

@@ -1,80 +1,29 @@
 """The program titlectl on the sample titles, without a display: pictures like the titler's, what it finds and changes."""
 import fcntl
-import json
 import os
 import re
 import shutil
 import signal
 import subprocess
-import tempfile
 import unittest
 
 import harness
-import samples
-
-TITLECTL = os.path.join(harness.BUILD, "bin", "titlectl")
-DONE, FINDINGS, WRONG_USE = 0, 1, 2
+import longfolder
+from titlectlhands import FINDINGS, TITLECTL, WRONG_USE, TitlectlTest
 
 
-class Titlectl(unittest.TestCase):
-    made = None
-
-    @classmethod
-    def setUpClass(cls):
-        cls.made = os.environ.get("TITLER_SAMPLES")
-        if cls.made is None:
-            cls.made = tempfile.mkdtemp(prefix="titler-")
-            cls.addClassCleanup(shutil.rmtree, cls.made, ignore_errors=True)
-            samples.make(harness.BUILD, cls.made)
-
-    def setUp(self):
-        self.work = tempfile.mkdtemp(prefix="titler-")
-        self.addCleanup(shutil.rmtree, self.work, ignore_errors=True)
-        data = os.path.join(self.work, "d")
-        samples.copy(self.made, data)
-        self.environment = harness.session.program_environment(harness.BUILD, K2SYS_AC_DATA=data, K2SYS_AC_ROOT="",
-                                                               K2SYS_LOG_DIR=self.work)
-        for name in ("DISPLAY", "WAYLAND_DISPLAY", "QT_QPA_PLATFORM"):
-            self.environment.pop(name, None)
-        self.titles = os.path.join(data, "defaultuser", "resources", "Titles")
-        self.folder = os.path.join(self.titles, "Welcome")
-
-    def run_titlectl(self, *arguments, code=DONE):
-        done = subprocess.run([TITLECTL, *arguments], env=self.environment, capture_output=True, text=True, check=False,
-                              timeout=120 * harness.SLOW, cwd=self.work)
-        self.assertEqual(done.returncode, code, done.stdout + done.stderr)
-        self.assertIsNone(harness.SANITIZER_REPORT.search(done.stderr), done.stderr)
-        return done
-
-    def json(self, *arguments, code=DONE):
-        return json.loads(self.run_titlectl(*arguments, "--json", code=code).stdout)
-
-    @staticmethod
-    def pictures(folder):
-        """The bytes of the four pictures of each title below the folder, by path."""
-        found = {}
-        for parent, _, names in os.walk(folder):
-            for name in names:
-                if name.endswith(tuple(harness.PICTURES)) and "_source_" not in name:
-                    with open(os.path.join(parent, name), "rb") as stream:
-                        found[os.path.relpath(os.path.join(parent, name), folder)] = stream.read()
-        return found
-
-    def first_title(self):
-        return os.path.join(self.folder, sorted(name for name in os.listdir(self.folder)
-                                                if name.endswith(".xml") and not name.startswith("."))[0])
-
+class Titlectl(TitlectlTest):
     def test_rendering_gives_the_bytes_of_the_titler(self):
-        before = self.pictures(self.titles)
+        before = self.pictures(self.root)
         self.assertGreater(len(before), 8)
         for jobs in ("1", "2"):
             out = os.path.join(self.work, "out" + jobs)
-            self.run_titlectl("render", "--jobs", jobs, "--out", out, self.titles)
+            self.run_titlectl("render", "--jobs", jobs, "--out", out, self.root)
             self.assertEqual(self.pictures(out), before)
         for name in before:
-            os.remove(os.path.join(self.titles, name))
-        self.run_titlectl("render", self.titles)
-        self.assertEqual(self.pictures(self.titles), before)
+            os.remove(os.path.join(self.root, name))
+        self.run_titlectl("render", self.root)
+        self.assertEqual(self.pictures(self.root), before)
 
     def test_one_size(self):
         out = os.path.join(self.work, "out")
@@ -83,7 +32,7 @@ class Titlectl(unittest.TestCase):
         self.assertTrue(all(name.endswith("_1920.png") for name in os.listdir(out)), os.listdir(out))
 
     def test_folders_without_faults_have_no_findings(self):
-        self.assertEqual(self.json("check", self.titles)["findings"], [])
+        self.assertEqual(self.json("check", self.root)["findings"], [])
 
     def test_faults_are_reported(self):
         title = self.first_title()
@@ -94,6 +43,71 @@ class Titlectl(unittest.TestCase):
         self.assertEqual(sorted((one["rule"], os.path.basename(one["file"])) for one in found),
                          [("order-omits", "unlisted.xml"), ("picture-missing", os.path.basename(title))])
         self.run_titlectl("check", "--without", "order-omits,picture-missing", self.folder)
+
+    def made_folder(self, rows):
+        """A folder of titles with one text and without a background, but for the last one, which is on black."""
+        longfolder.write_title(self.work, "one", "One")
+        harness.session.write_png(os.path.join(self.work, "black.png"), 192, 108, bytes(192 * 108 * 3))
+        lines = ["1,picture"] + [f"Row {row}," for row in range(rows - 1)] + ["Row on black,black.png"]
+        folder = os.path.join(self.root, "Made")
+        self.run_titlectl("make", os.path.join(self.work, "one.xml"), self.write("rows.csv", "\n".join(lines)), folder)
+        return folder
+
+    def test_one_fault_of_each_kind(self):
+        folder = self.made_folder(20)
+        self.assertEqual(self.json("check", folder)["findings"], [])
+        order = self.order(folder)
+        wanted = []
+
+        def change(number, rule, pattern, text):
+            path = os.path.join(folder, order[number])
+            with open(path, encoding="utf-8") as stream:
+                before = stream.read()
+            after = re.sub(pattern, text, before, flags=re.DOTALL)
+            self.assertNotEqual(after, before)
+            with open(path, "w", encoding="utf-8") as stream:
+                stream.write(after)
+            wanted.append((rule, order[number], "" if "<content" not in after else "text 1"))
+
+        change(0, "font-missing", r' font="KST"', ' font="No Such Font"')
+        change(1, "glyph-missing", r'<text-item text="R"', '<text-item text="\U000F0000"')
+        change(2, "text-empty", r'<text-item text="[^"]*"', '<text-item text=" "')
+        change(3, "text-empty", r'<meta-text.*</meta-text>', '<meta-text content-count="0" />')
+        change(4, "text-invisible", r' size="96"', ' size="0"')
+        change(19, "text-invisible", r' color="#FFFFFF"', ' color="#000000"')
+        change(5, "text-outside", r'position-X="60"', 'position-X="4000"')
+        change(6, "text-cut-off", r'position-Y="60"', 'position-Y="-60"')
+        change(7, "text-outside-safe-area", r'position-X="60"', 'position-X="-20"')
+        self.run_titlectl("render", folder)
+
+        def add(rule, name, what="", file=None):
+            wanted.append((rule, file or name, what))
+            return os.path.join(folder, name)
+
+        stems = [name.removesuffix(".xml") for name in order]
+        with open(add("title-unreadable", order[8]), "w", encoding="utf-8") as stream:
+            stream.write("<manifest")
+        os.remove(add("picture-missing", stems[9] + "_960.png", "picture 960", order[9]))
+        os.truncate(add("picture-torn", stems[10] + "_1920.png", "picture 1920", order[10]), 500)
+        shutil.copy(os.path.join(folder, stems[11] + "_960.png"),
+                    add("picture-size", stems[11] + "_240.png", "picture 240", order[11]))
+        os.utime(add("picture-old", stems[12] + "_240S.png", "picture 240 on black", order[12]), (0, 0))
+        rows = order[:13] + order[14:] + ["gone.xml", order[15]]
+        longfolder.write_order(folder, [name.removesuffix(".xml") for name in rows])
+        wanted += [("order-omits", order[13], ""), ("order-names-missing", ".order.xml", "gone.xml"),
+                   ("order-names-missing", ".order.xml", order[15])]
+        os.mkdir(add("leftover", ".titlectl-abcdef"))
+        for name in ("other_960.png", ".titler-new-1-1-1"):
+            shutil.copy(os.path.join(folder, stems[9] + "_240.png"), add("leftover", name))
+        found = self.json("check", folder, code=FINDINGS)["findings"]
+        self.assertCountEqual([(one["rule"], os.path.basename(one["file"]), one["object"]) for one in found], wanted)
+        self.assertTrue(all(one["reason"] for one in found))
+        rules = {rule["id"] for rule in self.json("check", "--rules")}
+        self.assertEqual(rules - {rule for rule, _, _ in wanted}, {"order-unreadable"})
+
+        os.truncate(os.path.join(folder, ".order.xml"), 200)
+        found = self.json("check", folder, code=FINDINGS)["findings"]
+        self.assertIn(("order-unreadable", ".order.xml"), [(one["rule"], os.path.basename(one["file"])) for one in found])
 
     def test_set_changes_what_show_shows(self):
         title = self.first_title()
@@ -107,21 +121,11 @@ class Titlectl(unittest.TestCase):
         stem = os.path.basename(title)[:-len(".xml")]
         self.assertEqual(changed, sorted(stem + suffix for suffix in harness.PICTURES))
 
-    def order(self, folder):
-        with open(os.path.join(folder, ".order.xml"), encoding="utf-8") as stream:
-            return re.findall(r'file-path="([^"]*)"', stream.read())
-
-    def write_list(self, text, name="list.csv"):
-        path = os.path.join(self.work, name)
-        with open(path, "w", encoding="utf-8", newline="") as stream:
-            stream.write(text)
-        return path
-
     def test_a_list_makes_titles_and_updates_them(self):
         template = self.first_title()
         text = str(self.json("show", template)["texts"][0]["id"])
-        names = self.write_list(f"No,{text}\r\n1,Anna Berg\r\n2,Bo Lind\r\n3,\"Cem, Ay\"\r\n")
-        folder = os.path.join(self.titles, "Made")
+        names = self.write("list.csv", f"No,{text}\r\n1,Anna Berg\r\n2,Bo Lind\r\n3,\"Cem, Ay\"\r\n")
+        folder = os.path.join(self.root, "Made")
         dry = self.json("make", "--dry-run", template, names, folder)
         self.assertEqual([row["outcome"] for row in dry["rows"]], ["would be made"] * 3)
         self.assertFalse(os.path.exists(folder))
@@ -137,7 +141,7 @@ class Titlectl(unittest.TestCase):
         self.assertEqual(self.pictures(folder), before)
 
         # The same list again, with one row changed and one more.
-        names = self.write_list(f"No,{text}\n3,Cem Ay\n1,Anna Berg\n4,Dora\n")
+        names = self.write("list.csv", f"No,{text}\n3,Cem Ay\n1,Anna Berg\n4,Dora\n")
         again = self.json("make", "--key", "No", template, names, folder)
         self.assertEqual([row["outcome"] for row in again["rows"]], ["updated", "updated", "made"])
         self.assertEqual(self.order(folder)[:3], first)
@@ -147,7 +151,7 @@ class Titlectl(unittest.TestCase):
     def test_a_wrong_row_stops_no_other_but_with_strict(self):
         template = self.first_title()
         text = str(self.json("show", template)["texts"][0]["id"])
-        names = self.write_list(f"{text}\nAnna\n{'x' * 301}\nBo\n")
+        names = self.write("list.csv", f"{text}\nAnna\n{'x' * 301}\nBo\n")
         folder = os.path.join(self.work, "made")
         done = self.run_titlectl("make", "--strict", template, names, folder, code=FINDINGS)
         self.assertIn("line 3:", done.stderr)
@@ -175,16 +179,17 @@ class Titlectl(unittest.TestCase):
         self.run_titlectl("render", "--force", self.folder)
 
     def test_killed_while_rendering_leaves_whole_pictures(self):
-        before = self.pictures(self.titles)
+        before = self.pictures(self.root)
         for delay in range(1, 6):
-            process = subprocess.Popen([TITLECTL, "render", "--jobs", "2", self.titles], env=self.environment,
+            process = subprocess.Popen([TITLECTL, "render", "--jobs", "2", self.root],
+                                       env=self.titlectl_environment(),
                                        stdout=subprocess.DEVNULL, stderr=subprocess.DEVNULL, start_new_session=True)
             try:
                 process.wait(delay * 0.1)
             except subprocess.TimeoutExpired:
                 os.killpg(process.pid, signal.SIGKILL)
                 process.wait()
-            self.assertEqual(self.pictures(self.titles), before)
+            self.assertEqual(self.pictures(self.root), before)
 
     def test_wrong_use(self):
         for arguments in ((), ("paint",), ("render",), ("render", "--fast", self.folder), ("check", "/nowhere")):

@@ -1,5 +1,5 @@
 // What a list would make of a template.
-#include "TitleTexts.h"
+#include "ListTexts.h"
 #include "titlectl/ListPlan.h"
 #include "titlectl/ListTable.h"
 #include "titlectl/TextFit.h"

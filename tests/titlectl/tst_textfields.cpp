@@ -1,5 +1,5 @@
 // Texts of a list in the place of texts of a template.
-#include "TitleTexts.h"
+#include "ListTexts.h"
 #include "titlectl/TextFields.h"
 
 #include "canvas/StyleDocument.h"

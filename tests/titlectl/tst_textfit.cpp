@@ -1,5 +1,5 @@
 // Measures ink and makes long texts smaller.
-#include "TitleTexts.h"
+#include "ListTexts.h"
 #include "titlectl/TextFields.h"
 #include "titlectl/TextFit.h"
 
