@@ -1,6 +1,7 @@
 #include "titlectl/MakeCommand.h"
 
 #include "document/Archive.h"
+#include "document/TText.h"
 #include "document/TitleParser.h"
 #include "library/TitleFileOperations.h"
 #include "titlectl/Arguments.h"
@@ -11,6 +12,7 @@
 #include "titlectl/Output.h"
 #include "titlectl/RenderBatch.h"
 #include "titlectl/TemplateFields.h"
+#include "titlectl/TitleTexts.h"
 
 #include <QDir>
 #include <QFileInfo>
@@ -47,6 +49,24 @@ QString nameOf(ListPlan::Outcome outcome, bool isDone)
         break;
     }
     return QStringLiteral("wrong");
+}
+
+// Returns the texts of a title by their ids, lines joined by "\n" as in the texts of the set command.
+QJsonObject textsOf(const Archive& title)
+{
+    QJsonObject texts;
+    for (const TText* text : title.text())
+        texts.insert(QString::number(text->getTextObjectID()), TitleTexts::plainText(*text));
+    return texts;
+}
+
+QString lineOf(const QJsonObject& texts)
+{
+    QStringList parts;
+    for (auto text = texts.begin(); text != texts.end(); ++text)
+        parts.append(QStringLiteral("%1=%2").arg(
+            text.key(), text.value().toString().replace(QLatin1Char('\n'), QLatin1String("\\n"))));
+    return parts.join(QLatin1String("  "));
 }
 
 } // namespace
@@ -123,15 +143,19 @@ int MakeCommand::report(const ListPlan& plan, const QStringList& errors, bool is
         const ListPlan::Row& row = plan.rows()[i];
         const QString reason = row.reason.isEmpty() ? errors.at(qsizetype(i)) : row.reason;
         const QString outcome = nameOf(reason.isEmpty() ? row.outcome : ListPlan::Outcome::Wrong, isDone);
-        rows.append(QJsonObject{{QStringLiteral("line"), row.line},
-                                {QStringLiteral("title"), row.stem},
-                                {QStringLiteral("outcome"), outcome},
-                                {QStringLiteral("reason"), reason}});
-        if (reason.isEmpty()) {
-            if (!isDone)
-                output.line(QStringLiteral("line %1: %2: %3").arg(row.line).arg(row.stem, outcome));
-            continue;
+        QJsonObject object{{QStringLiteral("line"), row.line},
+                           {QStringLiteral("title"), row.stem},
+                           {QStringLiteral("outcome"), outcome},
+                           {QStringLiteral("reason"), reason}};
+        if (!isDone && reason.isEmpty()) {
+            const QJsonObject texts = textsOf(*plan.title(int(i)));
+            object.insert(QStringLiteral("texts"), texts);
+            output.line(
+                QStringLiteral("line %1 %2: %3").arg(QString::number(row.line), outcome, lineOf(texts)));
         }
+        rows.append(object);
+        if (reason.isEmpty())
+            continue;
         ++bad;
         output.message(QStringLiteral("line %1: %2").arg(row.line).arg(reason));
     }

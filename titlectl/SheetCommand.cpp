@@ -45,7 +45,7 @@ int SheetCommand::run(const Arguments& arguments, Output& output)
     }
     for (const QString& title : sheet.unreadable())
         output.message(QStringLiteral("%1: the title cannot be read").arg(title));
-    output.line(QStringLiteral("%1 titles on %2 pages").arg(total).arg(sheet.pages()));
+    output.line(QStringLiteral("titles: %1, pages: %2").arg(total).arg(sheet.pages()));
     output.json(QJsonDocument(
         QJsonObject{{QStringLiteral("titles"), total},
                     {QStringLiteral("pages"), sheet.pages()},

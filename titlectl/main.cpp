@@ -9,7 +9,9 @@
 #include <QApplication>
 #include <QFile>
 #include <QFont>
+#include <QString>
 #include <QStringList>
+#include <QtGlobal>
 #include <chrono>
 #include <cstdio>
 #include <iostream>
@@ -20,6 +22,13 @@ namespace
 {
 
 constexpr std::chrono::seconds SYNC_DEADLINE(60);
+
+// Drops Qt's remarks about its surroundings, which would stand between the messages of the command.
+void showErrorsOnly(QtMsgType type, const QMessageLogContext& /*context*/, const QString& text)
+{
+    if (type == QtCriticalMsg || type == QtFatalMsg)
+        std::fprintf(stderr, "titlectl: %s\n", qUtf8Printable(text));
+}
 
 QStringList wordsOf(int argc, char* argv[])
 {
@@ -48,6 +57,7 @@ int main(int argc, char* argv[])
 {
     OwnerOnlyFiles::setUmask();
     qputenv("QT_QPA_PLATFORM", "offscreen");
+    qInstallMessageHandler(showErrorsOnly);
     const QStringList words = wordsOf(argc, argv); // Qt removes those that it understands
     const CommandTable table;
     // Texts about the program need neither fonts nor titles.

@@ -10,8 +10,9 @@
 namespace
 {
 
-const QByteArray WHOLE = R"({"fields": {"1": {"name": "Näme", "fit": {"width": 600, "smallest": 24}},
-"3": {"fit": {"width": 1280}}, "4": {"name": "Role"}}, "picture": "Photo"})";
+const QByteArray WHOLE =
+    "{\"fields\": {\"1\": {\"name\": \"Näme\", \"fit\": {\"width\": 600, \"smallest\": 24}}, "
+    "\"3\": {\"fit\": {\"width\": 1280}}, \"4\": {\"name\": \"Role\"}}, \"picture\": \"Photo\"}";
 
 } // namespace
 
@@ -51,8 +52,8 @@ private Q_SLOTS:
     {
         QString error;
         for (const QByteArray& bytes :
-             {QByteArray("{}"), WHOLE, QByteArray(R"({"picture": "x"})"),
-              QByteArray(R"({"fields": {"2": {"name": "3"}, "3": {"name": "2"}}})")}) {
+             {QByteArray("{}"), WHOLE, QByteArray("{\"picture\": \"x\"}"),
+              QByteArray("{\"fields\": {\"2\": {\"name\": \"3\"}, \"3\": {\"name\": \"2\"}}}")}) {
             const TemplateFields fields = TemplateFields::fromJson(bytes, error);
             QCOMPARE(error, QString());
             QVERIFY(TemplateFields::fromJson(fields.toJson(), error) == fields);
@@ -66,38 +67,39 @@ private Q_SLOTS:
         QTest::addColumn<QString>("reason");
         QTest::newRow("nothing") << QByteArray() << "It is not JSON";
         QTest::newRow("list") << QByteArray("[]") << "It is not an object";
-        QTest::newRow("fields") << QByteArray(R"({"fields": []})") << "\"fields\" is not an object";
-        QTest::newRow("key") << QByteArray(R"({"field": {}})") << "\"field\" in the file is not known";
-        QTest::newRow("id") << QByteArray(R"({"fields": {"5": {}}})") << "\"5\" is not the id of a text";
+        QTest::newRow("fields") << QByteArray("{\"fields\": []}") << "\"fields\" is not an object";
+        QTest::newRow("key") << QByteArray("{\"field\": {}}") << "\"field\" in the file is not known";
+        QTest::newRow("id") << QByteArray("{\"fields\": {\"5\": {}}}") << "\"5\" is not the id of a text";
         QTest::newRow("id with a sign")
-            << QByteArray(R"({"fields": {"+1": {}}})") << "\"+1\" is not the id of a text";
-        QTest::newRow("field") << QByteArray(R"({"fields": {"1": "x"}})")
+            << QByteArray("{\"fields\": {\"+1\": {}}}") << "\"+1\" is not the id of a text";
+        QTest::newRow("field") << QByteArray("{\"fields\": {\"1\": \"x\"}}")
                                << "The field \"1\" is not an object";
-        QTest::newRow("field key") << QByteArray(R"({"fields": {"1": {"nmae": "x"}}})")
+        QTest::newRow("field key") << QByteArray("{\"fields\": {\"1\": {\"nmae\": \"x\"}}}")
                                    << "\"nmae\" in field \"1\" is not known";
-        QTest::newRow("name") << QByteArray(R"({"fields": {"1": {"name": 5}}})")
+        QTest::newRow("name") << QByteArray("{\"fields\": {\"1\": {\"name\": 5}}}")
                               << "The name in \"1\" is not a text";
-        QTest::newRow("blank name") << QByteArray(R"({"fields": {"1": {"name": " "}}})")
+        QTest::newRow("blank name") << QByteArray("{\"fields\": {\"1\": {\"name\": \" \"}}}")
                                     << "The name in \"1\" is not a text";
-        QTest::newRow("brace") << QByteArray(R"({"fields": {"1": {"name": "{a"}}})")
+        QTest::newRow("brace") << QByteArray("{\"fields\": {\"1\": {\"name\": \"{a\"}}}")
                                << "The name \"{a\" has a brace";
-        QTest::newRow("twice") << QByteArray(R"({"fields": {"1": {"name": "a"}, "2": {"name": "A"}}})")
+        QTest::newRow("twice") << QByteArray(
+                                      "{\"fields\": {\"1\": {\"name\": \"a\"}, \"2\": {\"name\": \"A\"}}}")
                                << "Two fields are named \"A\"";
         QTest::newRow("usual name twice")
-            << QByteArray(R"({"fields": {"1": {"name": "2"}}})") << "Two fields are named \"2\"";
-        QTest::newRow("picture twice")
-            << QByteArray(R"({"fields": {"1": {"name": "Picture"}}})") << "Two fields are named \"picture\"";
-        QTest::newRow("fit") << QByteArray(R"({"fields": {"1": {"fit": 600}}})")
+            << QByteArray("{\"fields\": {\"1\": {\"name\": \"2\"}}}") << "Two fields are named \"2\"";
+        QTest::newRow("picture twice") << QByteArray("{\"fields\": {\"1\": {\"name\": \"Picture\"}}}")
+                                       << "Two fields are named \"picture\"";
+        QTest::newRow("fit") << QByteArray("{\"fields\": {\"1\": {\"fit\": 600}}}")
                              << "\"fit\" of field \"1\" is not an object";
-        QTest::newRow("no width") << QByteArray(R"({"fields": {"1": {"fit": {}}}})")
+        QTest::newRow("no width") << QByteArray("{\"fields\": {\"1\": {\"fit\": {}}}}")
                                   << "\"width\" of field \"1\" is not a number from 1 to 1280";
-        QTest::newRow("width 0") << QByteArray(R"({"fields": {"1": {"fit": {"width": 0}}}})")
+        QTest::newRow("width 0") << QByteArray("{\"fields\": {\"1\": {\"fit\": {\"width\": 0}}}}")
                                  << "\"width\" of field \"1\" is not a number from 1 to 1280";
-        QTest::newRow("half a pixel") << QByteArray(R"({"fields": {"1": {"fit": {"width": 10.5}}}})")
+        QTest::newRow("half a pixel") << QByteArray("{\"fields\": {\"1\": {\"fit\": {\"width\": 10.5}}}}")
                                       << "\"width\" of field \"1\" is not a number from 1 to 1280";
-        QTest::newRow("smallest") << QByteArray(
-                                         R"({"fields": {"1": {"fit": {"width": 9, "smallest": 1000}}}})")
-                                  << "\"smallest\" of field \"1\" is not a number from 1 to 999";
+        QTest::newRow("smallest")
+            << QByteArray("{\"fields\": {\"1\": {\"fit\": {\"width\": 9, \"smallest\": 1000}}}}")
+            << "\"smallest\" of field \"1\" is not a number from 1 to 999";
     }
     void refused()
     {

@@ -167,9 +167,13 @@ private Q_SLOTS:
         QVERIFY(file.open(QIODevice::ReadOnly));
         const QByteArray whole = file.readAll();
         file.close();
+        const QStringList rows = rowsOf(XlsxReader::read(path()));
+        // The last two bytes are the length of a comment that is not there.
         for (qsizetype length = 0; length < whole.size(); ++length) {
             writeBytes(whole.left(length));
-            QVERIFY(XlsxReader::read(path()).hasFailed());
+            const ListTable table = XlsxReader::read(path());
+            QVERIFY(length >= whole.size() - 2 ? rowsOf(table) == rows || table.hasFailed()
+                                               : table.hasFailed());
         }
     }
 
