@@ -20,7 +20,7 @@ class ListedTitles
 {
 public:
     // Titles whose files are completed before the first of them is moved into the folder.
-    static constexpr int BATCH = 64;
+    static constexpr int BATCH = 256;
 
     // All are kept as references. The folder exists and is locked for this program.
     ListedTitles(const ListPlan& plan, const Archive& sample, const QString& folder);

@@ -83,11 +83,11 @@ class Lists(FortyRows, TitlectlTest):
     def test_a_wrong_row_of_a_csv_stops_no_other(self):
         rows = rows_of_forty()
         lines = titlectlhands.csv_text(rows).split("\r\n")
-        lines[9] = '8,"never closed,x'
+        lines[9] = '9,"never closed,x'  # behind a row of two lines
         done = self.run_titlectl("make", self.template(), self.write("list.csv", "\r\n".join(lines)),
                                  os.path.join(self.root, "Names"), "--json", code=FINDINGS)
         wrong = [row for row in json.loads(done.stdout)["rows"] if row["outcome"] == "wrong"]
-        self.assertEqual([row["line"] for row in wrong], [10, BAD_ROW + 2])
+        self.assertEqual([row["line"] for row in wrong], [11, BAD_ROW + 2])
 
     def test_names_of_any_length_stay_within_their_width(self):
         longfolder.write_title(self.work, "name", "Name")
@@ -216,7 +216,7 @@ class FullDisk(FortyRows, TitlectlTest):
     def test_what_has_no_room_is_named_and_made_later(self):
         disk = os.path.join(self.work, "disk")
         os.makedirs(disk)
-        self.mount(disk, "size=12m")
+        self.mount(disk, "size=3m")
         self.addCleanup(subprocess.run, ["umount", "-l", disk], check=True)
         folder = os.path.join(disk, "Names")
         rows = [row for row in rows_of_forty() if row[0] != str(BAD_ROW)]
