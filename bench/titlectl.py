@@ -1,7 +1,7 @@
 """What titlectl takes for a title, beside other programs that draw text into a picture, where they are installed.
 
-Makes a list of titles with one outlined text each, then draws them: titlectl with one and with two processes all four files,
-the others (melt with a title clip, rsvg-convert, ImageMagick) the picture of 1920 pixels only. Prints milliseconds of wall and
+Makes a list of titles with one outlined text each, then draws them: titlectl on one and on two processors all four files, the
+others (melt with a title clip, rsvg-convert, ImageMagick) the picture of 1920 pixels only. Prints milliseconds of wall and
 processor time for each title, the median of some runs, and the memory of titlectl for the first ten and for all titles.
 """
 import argparse
@@ -27,14 +27,17 @@ PEER_TITLES = 20  # the others are slower
 WIDTH, HEIGHT = 1920, 1080
 SAMPLE = "20240101090000004"  # of the sample titles: without a background
 AIM = 0.25  # of the time of melt
+OURS = {1: "titlectl on one, four files", 2: "titlectl on two, four files"}
 
 
 class Cost:
     """What one run of a command took."""
 
-    def __init__(self, command, environment):
+    def __init__(self, command, environment, limit=None):
         began = time.monotonic()
-        process = subprocess.Popen(command, env=environment, stdout=subprocess.DEVNULL, stderr=subprocess.DEVNULL)
+        used = sorted(os.sched_getaffinity(0))[:limit]
+        process = subprocess.Popen(["taskset", "-c", ",".join(map(str, used)), *command], env=environment,
+                                   stdout=subprocess.DEVNULL, stderr=subprocess.DEVNULL)
         _, status, usage = os.wait4(process.pid, 0)
         process.returncode = os.waitstatus_to_exitcode(status)
         self.wall = time.monotonic() - began
@@ -44,11 +47,11 @@ class Cost:
             raise SystemExit(f"{command[0]} ended with {process.returncode}")
 
 
-def median_cost(commands, environment, runs, titles):
-    """Milliseconds of wall and of processor time for each title."""
+def median_cost(commands, environment, runs, titles, limit=None):
+    """Milliseconds of wall and of processor time for each title; limit is the number of processors to use."""
     walls, processors = [], []
     for _ in range(runs):
-        costs = [Cost(command, environment) for command in commands]
+        costs = [Cost(command, environment, limit) for command in commands]
         walls.append(sum(cost.wall for cost in costs) * 1000 / titles)
         processors.append(sum(cost.processor for cost in costs) * 1000 / titles)
     return statistics.median(walls), statistics.median(processors)
@@ -127,9 +130,9 @@ def main():
         shown = json.loads(subprocess.run([program, "show", "--json", folder], env=environment, check=True,
                                           stdout=subprocess.PIPE).stdout)
         rows = {}
-        for jobs in ("1", "2"):
-            rows[f"titlectl --jobs {jobs}, four files"] = median_cost([[program, "render", "--jobs", jobs, folder]], environment,
-                                                                      arguments.runs, arguments.titles)
+        for number in (1, 2):
+            rows[OURS[number]] = median_cost([[program, "render", "--jobs", str(number), folder]], environment, arguments.runs,
+                                             arguments.titles, number)
         files = [title["file"] for title in shown]
         first, all_titles = (Cost([program, "render", "--jobs", "1", *files[:count]], environment).memory
                              for count in (FIRST, arguments.titles))
@@ -140,13 +143,12 @@ def main():
     print(f"{'Milliseconds for each title':32} {'wall':>8} {'processor':>10}")
     for name, (wall, processor) in rows.items():
         print(f"{name:32} {wall:8.1f} {processor:10.1f}")
-    one, two = (rows[f"titlectl --jobs {jobs}, four files"][0] for jobs in ("1", "2"))
-    print(f"Two processes: {one / two:.2f} times the titles of one (aim 1.8)")
+    print(f"Two processors: {rows[OURS[1]][0] / rows[OURS[2]][0]:.2f} times the titles of one (aim 1.8)")
     print(f"Memory: {first:.0f} MB for {FIRST} titles, {all_titles:.0f} MB for {arguments.titles}: "
           f"{all_titles / first:.2f} (aim 1.3)")
     if "melt, one file" in rows:
         print(f"Processor time for four files, as a part of melt's for one: "
-              f"{rows['titlectl --jobs 1, four files'][1] / rows['melt, one file'][1]:.2f} (aim {AIM})")
+              f"{rows[OURS[1]][1] / rows['melt, one file'][1]:.2f} (aim {AIM})")
 
 
 if __name__ == "__main__":
