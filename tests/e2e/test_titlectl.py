@@ -31,6 +31,20 @@ class Titlectl(TitlectlTest):
         self.assertTrue(os.listdir(out))
         self.assertTrue(all(name.endswith("_1920.png") for name in os.listdir(out)), os.listdir(out))
 
+    def test_pictures_of_folders_of_the_same_name_are_not_mixed(self):
+        other = shutil.copytree(self.folder, os.path.join(self.work, "other", "Welcome"))
+        out = os.path.join(self.work, "out")
+        self.assertIn("Welcome", self.run_titlectl("render", "--out", out, self.folder, other, code=WRONG_USE).stderr)
+        self.assertFalse(os.path.exists(out))
+
+    def test_what_killed_processes_left_is_removed(self):
+        with open(os.path.join(self.folder, ".titler-new-1-1-1"), "w", encoding="ascii") as stream:
+            stream.write("half")
+        os.mkdir(os.path.join(self.folder, ".titlectl-abcdef"))
+        self.run_titlectl("check", "--without", "text-outside-safe-area", self.folder, code=FINDINGS)
+        self.run_titlectl("set", self.first_title(), "1=Text")
+        self.assertEqual([name for name in os.listdir(self.folder) if name.startswith(".")], [".order.xml"])
+
     def test_folders_without_faults_have_no_findings(self):
         self.assertEqual(self.json("check", self.root)["findings"], [])
 
