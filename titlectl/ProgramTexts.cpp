@@ -9,7 +9,7 @@
 namespace
 {
 
-const QString SUMMARY = QStringLiteral("renders, checks, shows and changes titles without a window");
+const QString SUMMARY = QStringLiteral("makes, renders, checks, shows and changes titles without a window");
 const QString EXIT_CODES =
     QStringLiteral("0: done; 1: something was found or could not be done; 2: wrong use, or a "
                    "folder that the titler has open");

@@ -1,4 +1,4 @@
-// titlectl: renders, checks, shows and changes titles without a window and without a display.
+// titlectl: makes, renders, checks, shows and changes titles without a window and without a display.
 
 #include "support/FileSyncQueue.h"
 #include "support/OwnerOnlyFiles.h"
