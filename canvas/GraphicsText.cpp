@@ -242,6 +242,11 @@ void GraphicsText::cancelTouch()
         m_touchEditor->cancelTouch();
 }
 
+QRectF GraphicsText::inkRect() const
+{
+    return m_painter->inkRect();
+}
+
 void GraphicsText::initNewTextSelectAll()
 {
     m_touchEditor->initNewTextSelectAll();

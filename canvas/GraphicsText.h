@@ -117,6 +117,9 @@ public:
     // Returns the raster pixels per stored pixel.
     double canvasRatio() const;
     QGraphicsDropShadowEffect* shadowEffect() const { return m_shadowEffect; }
+    // Returns the area that the glyphs and their outlines cover, in item coordinates; empty without ink.
+    // Shadows are not counted.
+    QRectF inkRect() const;
     // Copies focus, interaction and layout width to the parent and repaints it.
     void parentFollows();
 

@@ -160,3 +160,32 @@ void ParagraphGlyphs::draw(QPainter& painter, const QTransform& origin, const QR
         }
     }
 }
+
+QRectF ParagraphGlyphs::inkOf(const Glyph& glyph)
+{
+    QRectF ink = glyph.path->fill().boundingRect();
+    if (glyph.edge && glyph.edgeWidth > 0)
+        ink |= glyph.path->outline(glyph.edgeWidth).boundingRect();
+    else if (glyph.edge)
+        ink.adjust(-0.5, -0.5, 0.5, 0.5); // a hairline
+    return ink.translated(glyph.baseline);
+}
+
+QRectF ParagraphGlyphs::inkOf(const Run& run)
+{
+    QRectF ink;
+    for (qsizetype i = 0; i < std::min(run.indexes.size(), run.positions.size()); ++i)
+        if (const QRectF glyph = run.font.boundingRect(run.indexes[i]); !glyph.isEmpty())
+            ink |= glyph.translated(run.positions[i]);
+    return ink;
+}
+
+QRectF ParagraphGlyphs::inkRect() const
+{
+    QRectF ink;
+    for (const Glyph& glyph : m_glyphs)
+        ink |= inkOf(glyph);
+    for (const Run& run : m_runs)
+        ink |= inkOf(run);
+    return ink;
+}

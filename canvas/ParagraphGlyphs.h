@@ -35,6 +35,9 @@ public:
     void drawOutlines(QPainter& painter, const QTransform& origin, const QRectF& visible) const;
     void draw(QPainter& painter, const QTransform& origin, const QRectF& visible) const;
 
+    // Returns the area that the two cover; empty if they draw nothing.
+    QRectF inkRect() const;
+
 private:
     // What characters of the same style have in common.
     struct Look {
@@ -68,6 +71,8 @@ private:
         QRectF reach;
     };
 
+    static QRectF inkOf(const Glyph& glyph);
+    static QRectF inkOf(const Run& run);
     static Look lookOf(const TextStyle& style, double ratio);
     void addGlyph(const Look& look, const QString& text, const CaretGeometry::Caret& caret);
     void addRuns(const Glyph& glyph, const QRectF& reach);

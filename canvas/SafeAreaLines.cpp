@@ -6,8 +6,6 @@
 
 namespace
 {
-constexpr QRectF OuterArea(64.0, 36.0, 1152.0, 648.0);
-constexpr QRectF InnerArea(128.0, 72.0, 1024.0, 576.0);
 constexpr int PEN_WIDTH = 2;
 } // namespace
 
@@ -20,7 +18,7 @@ void SafeAreaLines::draw(int z)
     if (m_lines.isEmpty()) {
         const QPen solid(Qt::black, PEN_WIDTH, Qt::SolidLine);
         const QPen dotted(Qt::white, PEN_WIDTH, Qt::DotLine);
-        for (const QRectF& area : {OuterArea, InnerArea}) {
+        for (const QRectF& area : {OUTER_AREA, INNER_AREA}) {
             for (const QPen& pen : {solid, dotted}) {
                 QGraphicsRectItem* line = m_scene.addRect(area, pen);
                 line->setAcceptedMouseButtons(Qt::NoButton);

@@ -1,6 +1,7 @@
 #pragma once
 
 #include <QList>
+#include <QRectF>
 
 class QGraphicsRectItem;
 class QGraphicsScene;
@@ -11,6 +12,10 @@ class QGraphicsScene;
 class SafeAreaLines
 {
 public:
+    // In canvas pixels.
+    static constexpr QRectF OUTER_AREA{64.0, 36.0, 1152.0, 648.0};
+    static constexpr QRectF INNER_AREA{128.0, 72.0, 1024.0, 576.0};
+
     explicit SafeAreaLines(QGraphicsScene& scene);
 
     void draw(int z);

@@ -90,6 +90,15 @@ void TextPainter::drawItemText(QPainter* painter, const QRectF& exposed)
     painter->setRenderHint(QPainter::Antialiasing, antialiasing);
 }
 
+QRectF TextPainter::inkRect()
+{
+    recordGlyphs();
+    QRectF ink;
+    for (const ParagraphGlyphs& paragraph : m_paragraphs)
+        ink |= paragraph.inkRect();
+    return ink;
+}
+
 void TextPainter::drawItemBoundingRect(QPainter* painter, const QRectF& rect, int status,
                                        const QRectF& exposed)
 {

@@ -36,6 +36,9 @@ public:
 
     // Draws at least what is in the exposed rectangle, in item coordinates.
     void drawItemText(QPainter* painter, const QRectF& exposed);
+    // Returns the area that drawItemText() covers with glyphs and outlines, in item coordinates; empty if it
+    // draws nothing.
+    QRectF inkRect();
     // Draws at least what is in the exposed rectangle of the frame of a pair: status is that of the child,
     // FocusEdit or FocusObject.
     void drawItemBoundingRect(QPainter* painter, const QRectF& rect, int status, const QRectF& exposed);

@@ -5,9 +5,11 @@ Each target gets a folder of small files that reach its code: whole ones, and on
 in a way of their own. The same files come out each time.
 """
 import base64
+import io
 import os
 import struct
 import sys
+import zipfile
 import zlib
 
 HEAD = '<?xml version="1.0" encoding="UTF-8" ?>\n'
@@ -214,6 +216,66 @@ def pictures():
     yield png_name + GIF
 
 
+def csvs():
+    yield "Name,Role\n" + "".join(f'"{script}",x\r\n' for script in SCRIPTS)
+    yield "\ufeffName;Role\r\n\"a\"\"b\r\nc\";d\r\n\"not closed;x\r\ne;f\r\n"
+    yield "a\tb\n1\t2\t3\n\"x\"y\t2\n\n1\t2"
+    yield "\ufeffName\tRole\n快讯\t😀\n".encode("utf-16-le")
+    yield "a,A\n1,2\n"
+    yield b"a,b\nM\xfcller,x\ny,\xc3"
+    yield "a" + ",b" * 300
+    yield "a\n" + "x" * 60000
+    yield ""
+
+
+def json_lists():
+    yield '[{"Name": "Anna", "Role": "a\\nb"}, {"name": null, "Number": 12, "Share": 1e-7, "On": true}]'
+    yield '\ufeff[\n {"Name": "}]{[,\\\\"},\n 5, "x", [1], {"a": {}}, {"a": 1, "A": 2}, {"": 1}, {}\n]\n'
+    yield '[{"a": "\\ud83d"}, {"a": "\\ud83d\\ude00"}, {"a": "x},\n{"a": "y"}]'
+    yield "[" * 3000
+    yield '[{"a": 1}] x'
+    yield "[]"
+    yield "{}"
+
+
+SHEET = ('<worksheet><sheetData><row r="1"><c r="A1" t="s"><v>0</v></c><c r="B1" t="inlineStr"><is><t>b</t></is></c></row>'
+         '<row r="3"><c r="A3"><v>1.1000000000000001</v></c><c t="b"><v>1</v></c></row>'
+         '<row><c t="e"><v>#N/A</v></c></row><row><c t="str"><f>A1</f><v>x</v></c></row></sheetData></worksheet>')
+STRINGS = '<sst><si><t>Name</t></si><si><r><t>a</t></r><rPh><t>b</t></rPh><r><t>_x000D_</t></r></si></sst>'
+
+
+def workbooks():
+    yield f"{STRINGS}\n{SHEET}"
+    yield f"{STRINGS}\n<!DOCTYPE a [<!ENTITY b 'c'>]>{SHEET}"
+    yield f"<sst>{'<si/>' * 100}</sst>\n{SHEET.replace('<v>0</v>', '<v>99</v>')}"
+    yield f"{STRINGS}\n{SHEET.replace('B1', 'ZZ1')}"
+    yield f"{STRINGS}\n" + "<a>" * 100
+    yield f"{STRINGS}\n<a " + "".join(f'a{number}="" ' for number in range(500)) + "/>"
+    whole = zip_file({"_rels/.rels": '<a><Relationship Id="a" Type="x/officeDocument" Target="/b.xml"/></a>',
+                      "b.xml": '<b xmlns:r="r"><sheet r:id="a"/></b>',
+                      "_rels/b.xml.rels": '<a><Relationship Id="a" Type="x/worksheet" Target="s.xml"/></a>', "s.xml": SHEET})
+    yield whole
+    yield whole[:-10]
+    yield b"PK\5\6" + b"\0" * 18
+
+
+def zip_file(parts):
+    result = io.BytesIO()
+    with zipfile.ZipFile(result, "w", zipfile.ZIP_DEFLATED) as stream:
+        for name, text in parts.items():
+            stream.writestr(zipfile.ZipInfo(name), text, zipfile.ZIP_DEFLATED)
+    return result.getvalue()
+
+
+def fields():
+    yield ('{"fields": {"1": {"name": "Name", "fit": {"width": 600, "smallest": 24}}, "2": {"name": "快讯"}}, '
+           '"picture": "Photo"}')
+    yield '{"fields": {"3": {"fit": {"width": 1280}}}}'
+    yield '{"fields": {"5": {"name": "{a}", "fit": 5}}, "more": 1}'
+    yield "{}"
+    yield "[]"
+
+
 def encoded():
     white, shade, clear = b"\xff\xff\xff\xff", b"\x30\x20\x10\x80", b"\0\0\0\0"
     above = b"\0\0\0\0\0"  # the rest of the line as in the line above
@@ -226,10 +288,11 @@ def encoded():
 
 
 TARGETS = {"title": titles, "order": orders, "settings": settings, "paths": paths, "templates": templates,
-           "records": records, "frames": frames, "socket": sockets, "pictures": pictures,
-           "encoder": encoded}
+           "records": records, "frames": frames, "socket": sockets, "pictures": pictures, "encoder": encoded, "csv": csvs,
+           "jsonlist": json_lists, "xlsx": workbooks, "fields": fields}
 WORDS = ["manifest", "meta-bg", "meta-text", "content", "text-item", "index", "font-style", "last-archive", "PathInfo",
          "file-path", "value=\\\"", "type=\\\"order\\\"", "position-X", "text-align", "item-count", "size=\\\"", "&#x", "&amp;",
+         "sheetData", "inlineStr", "sharedStrings", "rPh", "fields", "smallest",
          "<![CDATA[", "<!--", "-->", "<?xml", "encoding=\\\"UTF-8\\\"", "IHDR", "IDAT", "PLTE", "tRNS", "iCCP", "zTXt", "IEND"]
 
 

@@ -228,6 +228,7 @@ void ArchiveList::saveLastArchivePathAndNotifyCanvasUpdate(ArchiveItem* item)
 {
     if (!item)
         return;
+    m_folder.lock();
     m_controller->setLastArchivePath(item->getArchiveDataPath());
     Q_EMIT signalUpdateCanvas(item->getArchiveData());
 }
@@ -299,7 +300,7 @@ void ArchiveList::cleanArchiveList()
 {
     m_loader.end();
     clearOldArchiveList();
-    m_folder.setPath(QString());
+    m_folder.close();
     if (m_folderLabel)
         m_folderLabel->clear();
 }

@@ -29,8 +29,20 @@ QString ListedFolder::lastUsed() const
     return folders.isEmpty() ? QString() : QString::fromStdString(folders.front());
 }
 
+void ListedFolder::close()
+{
+    m_lock.release();
+    m_path.clear();
+}
+
+void ListedFolder::lock()
+{
+    m_lock.take(m_path.toStdString(), FolderLock::Kind::Exclusive);
+}
+
 void ListedFolder::prepareOrder()
 {
+    lock();
     m_cleanUp = m_controller.prepareOrder(m_path) ? CleanUp::Allowed : CleanUp::Withheld;
 }
 

@@ -1,5 +1,7 @@
 #pragma once
 
+#include "support/FolderLock.h"
+
 #include <QList>
 #include <QString>
 #include <string>
@@ -25,7 +27,13 @@ public:
     // if there is none.
     QString lastUsed() const;
     void setPath(const QString& path) { m_path = path; }
-    // Makes the order file complete. Call before the titles are read.
+    // Clears the path and releases the lock.
+    void close();
+    // Locks the folder against programs that write titles there, unless it is locked by this object. The
+    // operator is not kept waiting for another program that holds the lock: the list goes on, and tries again
+    // with the next title.
+    void lock();
+    // Locks the folder and makes the order file complete. Call before the titles are read.
     void prepareOrder();
     // Saves the order. If the disk refuses it, it is kept and written later. known: the names of all title
     // files that have an item; rows of the old order whose titles could not be read keep their place.
@@ -50,5 +58,6 @@ private:
 
     ArchiveController& m_controller;
     QString m_path;
+    FolderLock m_lock;
     CleanUp m_cleanUp = CleanUp::Withheld;
 };

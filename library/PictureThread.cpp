@@ -2,9 +2,7 @@
 
 #include "document/Archive.h"
 #include "document/ITitleChangeReporter.h"
-#include "document/ImageResizer.h"
-#include "document/PngWriter.h"
-#include "library/TitlerUtility.h"
+#include "library/PictureFiles.h"
 #include "support/AlternateStack.h"
 #include "support/RefusedWrites.h"
 
@@ -12,22 +10,10 @@
 #include <QFile>
 #include <QFileInfo>
 #include <QMutexLocker>
-#include <future>
 #include <string>
 
 const QSize PictureThread::THUMBNAIL_SMALL_SIZE(240, 135);
 const QSize PictureThread::THUMBNAIL_MIDDLE_SIZE(960, 540);
-
-namespace
-{
-
-// Returns an empty path for a name that is not valid for a picture.
-QString picturePath(const Archive& archive, const std::string& name)
-{
-    return QString::fromStdString(TitlerUtility::getPicturePathFromTitlePath(archive.getPath(), name));
-}
-
-} // namespace
 
 PictureThread::PictureThread(QObject* parent) : QThread(parent)
 {
@@ -119,7 +105,7 @@ void PictureThread::removePictures(const Archive& archive)
 {
     for (const std::string& name : {archive.getThumbnailBig(), archive.getThumbnailMiddle(),
                                     archive.getThumbnailBlack(), archive.getThumbnailSmall()}) {
-        if (const QString path = picturePath(archive, name); !path.isEmpty()) {
+        if (const QString path = PictureFiles::path(archive, name); !path.isEmpty()) {
             QFile::remove(path);
             if (QFileInfo(path).dir().exists())
                 RefusedWrites::forget(path.toStdString());
@@ -129,23 +115,7 @@ void PictureThread::removePictures(const Archive& archive)
 
 void PictureThread::saveArchiveThumnail(const Archive& archive, const QImage& big, const QImage& middle)
 {
-    const QString bigPath = picturePath(archive, archive.getThumbnailBig());
-    const QString middlePath = picturePath(archive, archive.getThumbnailMiddle());
-    const QString blackPath = picturePath(archive, archive.getThumbnailBlack());
-    const QString smallPath = picturePath(archive, archive.getThumbnailSmall());
-
-    // The big picture takes four fifths of the time, so it is written in a thread of its own. A picture that
-    // cannot be written is kept or skipped; the others are still useful.
-    const std::string title = archive.getPath();
-    std::future<bool> bigSaved =
-        std::async(std::launch::async, [&] { return PngWriter::saveOrKeep(big, bigPath, title); });
-    PngWriter::saveOrKeep(middle, middlePath, title);
-    ImageResizer resizer;
-    resizer.keepRefusedFor(title);
-    resizer.resizeImageToThumbnail(middle, blackPath.toStdWString(), smallPath.toStdWString(),
-                                   static_cast<unsigned>(THUMBNAIL_SMALL_SIZE.width()),
-                                   static_cast<unsigned>(THUMBNAIL_SMALL_SIZE.height()));
-    bigSaved.wait();
+    PictureFiles::write(archive, big, middle);
     if (ITitleChangeReporter* reporter = ITitleChangeReporter::instance())
         reporter->changeTitlerStatus(FileManagerDefine::TITLE_PICTURES_CHANGED,
                                      QString::fromStdString(archive.getPath()));

@@ -16,6 +16,7 @@
 #include <QPixmap>
 #include <QPoint>
 #include <string>
+#include <utility>
 
 const QSize ThumbnailRender::THUMBNAIL_BIG_SIZE(1920, 1080);
 const QSize ThumbnailRender::THUMBNAIL_MID_SIZE(1280, 720);
@@ -29,11 +30,7 @@ const QColor ThumbnailRender::DROP_SHADOW_COLOR(0, 0, 0, 255);
 namespace
 {
 
-// Positions are converted from the 1280 canvas to the 1920 raster: times three to 3840, then half of it.
-const double TO_DOUBLE_RASTER = 3.0;
-const double TO_RASTER = 0.5;
 const double CANVAS_RATIO = 2.0 / 3.0;
-const double RASTER_RATIO = 1.0;
 
 constexpr int IDLE_TIME = 60000; // ms until memory that is kept for the next pictures is given back
 
@@ -74,10 +71,8 @@ QImage renderScene(QGraphicsScene& scene, QSize size)
 ThumbnailRender::ThumbnailRender(QObject* parent) : IThumbnailRender(parent)
 {
     m_middleScene.setSceneRect(SCENE_RECT_SIZE);
-    m_bigScene.setSceneRect(BIG_SIZE_SCENE_RECT_SIZE);
-    // Each scene is filled, rendered once and cleared, so an index would not pay off.
+    // The scene is filled, rendered once and cleared, so an index would not pay off.
     m_middleScene.setItemIndexMethod(QGraphicsScene::NoIndex);
-    m_bigScene.setItemIndexMethod(QGraphicsScene::NoIndex);
     m_idleTime.setSingleShot(true);
     m_idleTime.setInterval(IDLE_TIME);
     connect(&m_idleTime, &QTimer::timeout, this, &ThumbnailRender::giveBackMemory);
@@ -184,7 +179,7 @@ void ThumbnailRender::makeBigSizeThumbnail(const Archive& archive)
     auto job = std::make_unique<BigPicture>();
     job->archive = std::make_unique<Archive>(archive);
     job->hadTitle = QFile::exists(QString::fromStdString(archive.getPath()));
-    keepBackground(archive);
+    keepBackground(archive, [this] { announceDecoded(); });
     job->background = m_background;
     m_bigPictures.push_back(std::move(job));
     announceDecoded();
@@ -192,18 +187,18 @@ void ThumbnailRender::makeBigSizeThumbnail(const Archive& archive)
 
 void ThumbnailRender::expectPictures(const Archive& archive)
 {
-    keepBackground(archive);
+    keepBackground(archive, [this] { announceDecoded(); });
 }
 
-// Makes m_background that of the title.
-void ThumbnailRender::keepBackground(const Archive& archive)
+// Makes m_background that of the title. decoded is called in another thread if it is decoded there.
+void ThumbnailRender::keepBackground(const Archive& archive, std::function<void()> decoded)
 {
     m_idleTime.start();
     const QString path = archive.getFullPathOfBgResourceBig();
     if (path.isEmpty())
         m_background.reset();
     else if (!m_background || !m_background->isThatOf(path))
-        m_background = std::make_shared<DecodedBackground>(path, [this] { announceDecoded(); });
+        m_background = std::make_shared<DecodedBackground>(path, std::move(decoded));
 }
 
 void ThumbnailRender::giveBackMemory()
@@ -239,34 +234,27 @@ void ThumbnailRender::drawNextBigPicture()
     const QFileInfo title(QString::fromStdString(job->archive->getPath()));
     if (job->hadTitle && !title.exists() && title.dir().exists())
         return; // the title was deleted meanwhile
-    createBigSizeCanvasSceneUsingArchiveData(
-        *job->archive, job->background ? job->background->picture()->pixmap() : QPixmap());
-    saveBigSizeThumnail(*job->archive, renderBigAndMiddleSizeCanvasScene());
-    clearBigSizeCanvasScene();
+    const QPixmap background = job->background ? job->background->picture()->pixmap() : QPixmap();
+    saveBigSizeThumnail(*job->archive, drawPictures(*job->archive, background));
 }
 
-void ThumbnailRender::createBigSizeCanvasSceneUsingArchiveData(const Archive& archive,
-                                                               const QPixmap& background)
+QList<QImage> ThumbnailRender::drawPictures(const Archive& archive)
 {
-    m_bigBackground = new GraphicsPixmap(archive.getFullPathOfBgResourceBig(), background);
-    m_bigScene.addItem(m_bigBackground);
-    m_bigBackground->setPos(0, 0);
-    m_bigBackground->setZValue(archive.getBgPointZ());
-    for (TText* record : archive.text()) {
-        auto* text = new GraphicsText(record, record->getTextObjectID());
-        text->setRadio(RASTER_RATIO, true);
-        text->setPos(record->getXValue() * TO_DOUBLE_RASTER * TO_RASTER,
-                     record->getYValue() * TO_DOUBLE_RASTER * TO_RASTER);
-        text->setZValue(record->getZValue());
-        text->initShowText();
-        m_bigScene.addItem(text);
-    }
-    limitTextsToRaster(m_bigScene);
+    keepBackground(archive, [] {});
+    return drawPictures(archive, m_background ? m_background->picture()->pixmap() : QPixmap());
+}
+
+QList<QImage> ThumbnailRender::drawPictures(const Archive& archive, const QPixmap& background)
+{
+    m_bigScene.show(archive, background);
+    const QList<QImage> images = renderBigAndMiddleSizeCanvasScene();
+    clearBigSizeCanvasScene();
+    return images;
 }
 
 QList<QImage> ThumbnailRender::renderBigAndMiddleSizeCanvasScene()
 {
-    const QImage big = renderScene(m_bigScene, THUMBNAIL_BIG_SIZE);
+    const QImage big = renderScene(m_bigScene.scene(), THUMBNAIL_BIG_SIZE);
     QImage middle = RasterPool::take(THUMBNAIL_MIDDLE_SIZE);
     if (!big.isNull() && !middle.isNull())
         HalfPicture::reduce(big, middle);
@@ -281,7 +269,6 @@ void ThumbnailRender::saveBigSizeThumnail(const Archive& archive, const QList<QI
 void ThumbnailRender::clearBigSizeCanvasScene()
 {
     m_bigScene.clear();
-    m_bigBackground = nullptr;
     clearBigSizeCanvasSceneResource();
 }
 

@@ -3,6 +3,7 @@
 #include "canvas/IThumbnailRender.h"
 #include "library/DecodedBackground.h"
 #include "library/PictureThread.h"
+#include "library/RasterScene.h"
 
 #include <QColor>
 #include <QGraphicsScene>
@@ -12,6 +13,7 @@
 #include <QSize>
 #include <QTimer>
 #include <deque>
+#include <functional>
 #include <memory>
 
 class Archive;
@@ -57,6 +59,10 @@ public:
     void waitForProgress(int longest) override;
     void folderRenamed(const QString& before, const QString& after) override;
 
+    // Draws the 1920x1080 and the 960x540 picture of the title at once, as the slow stage does, and returns
+    // them without writing files.
+    QList<QImage> drawPictures(const Archive& archive);
+
     // Called before the scenes are cleared. For subclasses with resources of their own.
     virtual void clearBigSizeCanvasSceneResource();
     virtual void clearMiddleSizeCanvasSceneResource();
@@ -65,8 +71,8 @@ private:
     void makeMiddleAndSmallSizeThumbnail(const Archive& archive);
     void makeBigSizeThumbnail(const Archive& archive);
     void createMiddleSizeCanvasSceneUsingArchiveData(const Archive& archive);
-    void createBigSizeCanvasSceneUsingArchiveData(const Archive& archive, const QPixmap& background);
-    void keepBackground(const Archive& archive);
+    QList<QImage> drawPictures(const Archive& archive, const QPixmap& background);
+    void keepBackground(const Archive& archive, std::function<void()> decoded);
     void giveBackMemory();
     void announceDecoded();
     void drawDecodedBigPictures();
@@ -91,8 +97,7 @@ private:
     std::shared_ptr<DecodedBackground> m_background; // of the latest title; null for one without
     QTimer m_idleTime{this};
     QGraphicsScene m_middleScene;
-    QGraphicsScene m_bigScene;
+    RasterScene m_bigScene;
     GraphicsPixmap* m_middleBackground = nullptr; // owned by m_middleScene
-    GraphicsPixmap* m_bigBackground = nullptr;    // owned by m_bigScene
     PictureThread m_pictureThread;                // last, so that it is destroyed before the scenes
 };

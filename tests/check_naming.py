@@ -16,7 +16,7 @@ import tempfile
 import sourcetree
 
 # Their headers are read by clang-tidy.
-TIDY_FOLDERS = sourcetree.LAYERS + ["appliance", "gallery"]
+TIDY_FOLDERS = sourcetree.LAYERS + ["titlectl", "appliance", "gallery"]
 CHECK = "readability-identifier-naming"
 
 COMMENT_OR_STRING = re.compile(r'//[^\n]*|/\*.*?\*/|"(?:\\.|[^"\\\n])*"', re.DOTALL)

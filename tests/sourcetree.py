@@ -6,7 +6,7 @@ import tempfile
 # In the order of dependence: a folder includes only from itself and from those before it.
 LAYERS = ["support", "messaging", "document", "touchui", "canvas", "panel", "library", "app"]
 # Above all layers, and not included by one.
-PROGRAMS = ["appliance", "gallery", "bench"]
+PROGRAMS = ["titlectl", "appliance", "gallery", "bench"]
 FOLDERS = LAYERS + PROGRAMS + ["fuzz", "tests"]
 
 

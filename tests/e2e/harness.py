@@ -24,12 +24,15 @@ HERE = os.path.dirname(os.path.abspath(__file__))
 sys.path.insert(0, os.path.join(os.path.dirname(os.path.dirname(HERE)), "scripts"))
 sys.path.insert(0, os.path.dirname(HERE))
 
+import renderedagain  # noqa: E402  pylint: disable=wrong-import-position
 import samples  # noqa: E402  pylint: disable=wrong-import-position
 import session  # noqa: E402  pylint: disable=wrong-import-position
 
 BUILD = os.environ.get("TITLER_BUILD", os.path.join(session.ROOT, "build"))
 # Sanitizers make everything slower, never wrong.
 SLOW = 4 if os.path.basename(BUILD).endswith("asan") else 1
+# Whether the pictures that each test leaves are rendered again and compared.
+RENDER_AGAIN = os.environ.get("TITLER_RENDER_AGAIN") == "1"
 
 SANITIZER_REPORT = re.compile(r"ERROR: \w*Sanitizer|WARNING: \w*Sanitizer|runtime error:")
 
@@ -251,6 +254,10 @@ class TitlerTest(unittest.TestCase):
         reports = self.sanitizer_reports()
         if reports:
             return reports
+        if RENDER_AGAIN and not any(program.killed for program in self.programs):
+            different = renderedagain.different_pictures(BUILD, self.environment, os.path.dirname(self.folder()))
+            if different:
+                return f"rendered otherwise: {different}"
         return f"exit codes {ends}" if set(ends) - {0} else None
 
     def sanitizer_reports(self):

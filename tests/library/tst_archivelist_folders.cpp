@@ -1,6 +1,7 @@
 // Folders as other programs, full disks and torn writes leave them: what the title list makes of them.
 #include "ItemLooks.h"
 #include "TitleListFixture.h"
+#include "support/FolderLock.h"
 #include "tests/support/FullDisk.h"
 #include "tests/touchui/TouchDevice.h"
 
@@ -87,6 +88,8 @@ private Q_SLOTS:
     void folderGoneWhileOpen();
     void titleGoneWhileOpen();
     void titlesOfOneMoment();
+    void openFolderIsLocked();
+    void folderLockedByAnotherProgramOpens();
 
 private:
     QString abc(const QString& name)
@@ -480,6 +483,34 @@ void tst_archivelist_folders::titlesOfOneMoment()
     QCOMPARE(QSet<QString>(stems.begin(), stems.end()).size(), 22);
     for (const QString& stem : stems)
         QVERIFY(QFile::exists(folder + "/" + stem + ".xml"));
+}
+
+void tst_archivelist_folders::openFolderIsLocked()
+{
+    const QString first = abc(QStringLiteral("first"));
+    const QString second = abc(QStringLiteral("second"));
+    const auto isLocked = [](const QString& folder) {
+        return FolderLock().take(folder.toStdString(), FolderLock::Kind::Shared) == FolderLock::Result::Busy;
+    };
+    m->open(first);
+    QVERIFY(isLocked(first));
+    m->open(second);
+    QVERIFY(!isLocked(first));
+    QVERIFY(isLocked(second));
+    m->list->cleanArchiveList();
+    QVERIFY(!isLocked(second));
+}
+
+void tst_archivelist_folders::folderLockedByAnotherProgramOpens()
+{
+    const QString folder = abc(QStringLiteral("locked"));
+    FolderLock other;
+    QCOMPARE(other.take(folder.toStdString(), FolderLock::Kind::Exclusive), FolderLock::Result::Taken);
+    m->open(folder);
+    QCOMPARE(m->stems(), (Names{"a", "b", "c"}));
+    other.release();
+    m->list->selectArchive(1); // gets the lock as soon as it is free
+    QCOMPARE(other.take(folder.toStdString(), FolderLock::Kind::Exclusive), FolderLock::Result::Busy);
 }
 
 QTEST_MAIN(tst_archivelist_folders)
