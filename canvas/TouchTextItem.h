@@ -3,6 +3,7 @@
 #include "canvas/TextObjectConstants.h"
 #include "touchui/CanvasTextField.h"
 
+#include <QEvent>
 #include <QGraphicsTextItem>
 #include <QRectF>
 
