@@ -45,6 +45,25 @@ int count(const QImage& image, const QColor& color)
     return found;
 }
 
+// The rectangle around all pixels that are not transparent.
+QRect paintedRect(const QImage& image)
+{
+    QRect painted;
+    for (int y = 0; y < image.height(); ++y)
+        for (int x = 0; x < image.width(); ++x)
+            if (qAlpha(image.pixel(x, y)) > 0)
+                painted |= QRect(x, y, 1, 1);
+    return painted;
+}
+
+// Whether the ink covers all that is painted, and reaches at most two pixels farther.
+bool isInk(const QRectF& ink, const QRect& painted)
+{
+    const QRectF within = QRectF(painted).adjusted(1.0, 1.0, -1.0, -1.0);
+    const QRectF around = QRectF(painted).adjusted(-2.0, -2.0, 2.0, 2.0);
+    return ink.contains(within) && around.contains(ink);
+}
+
 } // namespace
 
 // Geometry and looks of a text object.
@@ -60,6 +79,7 @@ private Q_SLOTS:
     void outlineUnderGlyphs();
     void everyScriptLeavesInk_data();
     void everyScriptLeavesInk();
+    void inkOfAllParagraphs();
     void frames();
     void unpaintedCaretOfDocument();
     void paintedInAViewInsideAWindow();
@@ -180,6 +200,27 @@ void tst_textpainter::everyScriptLeavesInk()
     QFETCH(QString, text);
     Pair pair(makeRecord(text));
     QVERIFY(count(picture(pair.scene), QColor(255, 255, 255)) > 100);
+}
+
+void tst_textpainter::inkOfAllParagraphs()
+{
+    // The longest line is the second one, with an outline; the last one has a descender.
+    TText record = makeRecord("I\nWWW\ng");
+    TEdge edge;
+    edge.setEdgeWidth(6);
+    for (std::size_t i = 2; i < 5; ++i) {
+        record.textItems()[i]->setIsTextEdge(1);
+        record.textItems()[i]->setTextEdge(edge);
+    }
+    Pair pair(record);
+    const auto ink = [&] { return pair.child->mapRectToScene(pair.child->inkRect()); };
+    const QRectF before = ink();
+    QVERIFY(isInk(before, paintedRect(picture(pair.scene))));
+    typeTextAt(*pair.child, 1, "IIIIIIIIIIIIIIIIIIII");
+    QVERIFY(ink().width() > before.width() + 20.0);
+    QVERIFY(isInk(ink(), paintedRect(picture(pair.scene))));
+    TText blank = makeRecord(" \n ");
+    QVERIFY(Pair(blank).child->inkRect().isEmpty());
 }
 
 void tst_textpainter::frames()

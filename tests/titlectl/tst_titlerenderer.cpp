@@ -3,7 +3,11 @@
 #include "library/ThumbnailRender.h"
 #include "tests/support/Patience.h"
 
+#include <QColor>
+#include <QFile>
+#include <QImage>
 #include <QTest>
+#include <string>
 
 class tst_titlerenderer : public QObject
 {
@@ -15,6 +19,7 @@ private Q_SLOTS:
     void oneSize_data();
     void oneSize();
     void backgroundIsFoundFromAnotherFolder();
+    void eachTitleHasItsOwnBackground();
     void errors_data();
     void errors();
 
@@ -82,6 +87,39 @@ void tst_titlerenderer::backgroundIsFoundFromAnotherFolder()
     const QString other = m_fixture.makeFolder("elsewhere");
     QCOMPARE(TitleRenderer().render({folder + "/one.xml", other, PictureFiles::Big}), QString());
     QCOMPARE(QImage(other + "/one_1920.png").pixelColor(1900, 1000), QColor(Qt::green));
+}
+
+// The renderer keeps the background of a title for the next one.
+void tst_titlerenderer::eachTitleHasItsOwnBackground()
+{
+    const QString folder = m_fixture.makeFolder("backgrounds");
+    const auto paint = [&](const QString& stem, const QColor& color) {
+        QImage image(1920, 1080, QImage::Format_RGB32);
+        image.fill(color);
+        return image.save(folder + '/' + stem + "_source_1920.png");
+    };
+    TitleRenderer renderer;
+    const auto corner = [&](const QString& stem) {
+        Archive archive;
+        ArchiveController().getOneArchive(folder + '/' + stem + ".xml", &archive);
+        return renderer.draw(archive).at(0).pixelColor(1900, 1000);
+    };
+    for (const char* stem : {"one", "two", "three"}) {
+        const auto archive = LibraryFixture::makeRecord(folder, stem, "text");
+        if (stem != std::string("three"))
+            archive->setBgResourceBig(stem + std::string("_source_1920.png"));
+        QVERIFY(ArchiveController().saveNewArchive(folder, archive.get()));
+    }
+    QVERIFY(paint("one", Qt::green));
+    QVERIFY(paint("two", Qt::green));
+    QCOMPARE(corner("one"), QColor(Qt::green));
+    QCOMPARE(corner("two"), QColor(Qt::green));
+    QVERIFY(paint("two", Qt::red));
+    QCOMPARE(corner("two"), QColor(Qt::red));
+    QCOMPARE(corner("three").alpha(), 0);
+    QCOMPARE(corner("one"), QColor(Qt::green));
+    QVERIFY(QFile::remove(folder + "/one_source_1920.png"));
+    QCOMPARE(corner("one").alpha(), 0);
 }
 
 void tst_titlerenderer::errors_data()
