@@ -66,24 +66,22 @@ bool TreeTouch::takesMouse(QEvent* event)
 {
     if (!m_tree.isEnabled())
         return false;
-    const auto* mouse = static_cast<QMouseEvent*>(event);
     switch (event->type()) {
     case QEvent::MouseButtonPress:
     case QEvent::MouseButtonDblClick:
-        event->accept();
-        mousePressed(*mouse);
-        return true;
+        mousePressed(*static_cast<QMouseEvent*>(event));
+        break;
     case QEvent::MouseMove:
-        event->accept();
-        mouseMoved(*mouse);
-        return true;
+        mouseMoved(*static_cast<QMouseEvent*>(event));
+        break;
     case QEvent::MouseButtonRelease:
-        event->accept();
-        mouseReleased(*mouse);
-        return true;
+        mouseReleased(*static_cast<QMouseEvent*>(event));
+        break;
     default:
         return false;
     }
+    event->accept();
+    return true;
 }
 
 void TreeTouch::mousePressed(const QMouseEvent& event)
